@@ -1,0 +1,24 @@
+#include "Platform/Console.h"
+
+#include <utility>
+
+namespace velmora {
+
+namespace {
+
+// Null stands for standard output, whose address is no constant.
+std::FILE* console = nullptr;
+
+} // namespace
+
+void printLine(std::string_view text) {
+    std::FILE* stream = console ? console : stdout;
+    std::fwrite(text.data(), 1, text.size(), stream);
+    std::fputc('\n', stream);
+}
+
+std::FILE* redirectConsole(std::FILE* stream) {
+    return std::exchange(console, stream);
+}
+
+} // namespace velmora

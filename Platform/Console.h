@@ -1,0 +1,16 @@
+#pragma once
+
+#include <cstdio>
+#include <string_view>
+
+namespace velmora {
+
+/// Prints a line where the process's classes print what is not for the log (standard output unless
+/// redirected).
+void printLine(std::string_view text);
+
+/// Sends those lines to `stream` from now on; a program whose standard output carries a result keeps it clean
+/// by sending them to standard error. Returns the earlier stream. The caller keeps `stream` open.
+std::FILE* redirectConsole(std::FILE* stream);
+
+} // namespace velmora

@@ -1,0 +1,50 @@
+#include "Platform/Clock.h"
+
+#include <cstdio>
+#include <ctime>
+
+namespace velmora {
+
+namespace {
+
+/// "2026-11-16" + separator + "05:00:00", of the seconds as they stand.
+std::string format(std::chrono::sys_seconds moment, const char* separator) {
+    const auto day = std::chrono::floor<std::chrono::days>(moment);
+    const std::chrono::year_month_day date(day);
+    const std::chrono::hh_mm_ss time(moment - day);
+    char dateText[32];
+    std::snprintf(dateText, sizeof dateText, "%04d-%02u-%02u", static_cast<int>(date.year()),
+                  static_cast<unsigned>(date.month()), static_cast<unsigned>(date.day()));
+    char timeText[32];
+    std::snprintf(timeText, sizeof timeText, "%02d:%02d:%02d", static_cast<int>(time.hours().count()),
+                  static_cast<int>(time.minutes().count()), static_cast<int>(time.seconds().count()));
+    return std::string(dateText) + separator + timeText;
+}
+
+} // namespace
+
+Time MachineClock::now() const {
+    timespec moment{};
+    ::clock_gettime(CLOCK_REALTIME, &moment);
+    return Time(std::chrono::seconds(moment.tv_sec) + std::chrono::nanoseconds(moment.tv_nsec));
+}
+
+ZoneState MachineClock::zoneAt(Time moment) const {
+    // localtime_r looks at TZ only the first time; a zone that is changed while the program runs shall show.
+    ::tzset();
+    const std::time_t seconds = std::chrono::floor<std::chrono::seconds>(moment).time_since_epoch().count();
+    std::tm local{};
+    if (!::localtime_r(&seconds, &local))
+        return {};
+    return {std::chrono::seconds(local.tm_gmtoff), local.tm_isdst > 0};
+}
+
+std::string dateDescription(Time moment) {
+    return format(std::chrono::floor<std::chrono::seconds>(moment), " ") + " +0000";
+}
+
+std::string localDateAndTime(const Clock& clock, Time moment, const char* separator) {
+    return format(std::chrono::floor<std::chrono::seconds>(moment) + clock.zoneAt(moment).offset, separator);
+}
+
+} // namespace velmora

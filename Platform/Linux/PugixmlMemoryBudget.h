@@ -1,0 +1,39 @@
+#pragma once
+
+#include <pugixml.hpp>
+
+#include <cstddef>
+
+namespace velmora {
+
+/// While it lives, pugixml gets this much memory and no more: a document of nothing but tags and attributes
+/// takes many times its own size. pugixml has one allocator a process, hence the static; main thread only.
+class PugixmlMemoryBudget {
+public:
+    explicit PugixmlMemoryBudget(std::size_t bytes)
+        : _allocate(pugi::get_memory_allocation_function()),
+          _deallocate(pugi::get_memory_deallocation_function()) {
+        left = bytes;
+        allocate = _allocate;
+        pugi::set_memory_management_functions(&allocateWithin, _deallocate);
+    }
+    ~PugixmlMemoryBudget() { pugi::set_memory_management_functions(_allocate, _deallocate); }
+    PugixmlMemoryBudget(const PugixmlMemoryBudget&) = delete;
+    PugixmlMemoryBudget& operator=(const PugixmlMemoryBudget&) = delete;
+
+private:
+    static void* allocateWithin(std::size_t size) {
+        if (size > left)
+            return nullptr;
+        left -= size;
+        return allocate(size);
+    }
+
+    static inline std::size_t left = 0;
+    static inline pugi::allocation_function allocate = nullptr;
+
+    pugi::allocation_function _allocate;
+    pugi::deallocation_function _deallocate;
+};
+
+} // namespace velmora

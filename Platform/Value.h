@@ -1,0 +1,175 @@
+#pragma once
+
+#include "Platform/Bytes.h"
+
+#include <chrono>
+#include <concepts>
+#include <cstdint>
+#include <memory>
+#include <optional>
+#include <string>
+#include <string_view>
+#include <unordered_map>
+#include <variant>
+#include <vector>
+
+namespace velmora {
+
+class Array;
+class Dictionary;
+using ArrayRef = std::shared_ptr<Array>;
+using DictionaryRef = std::shared_ptr<Dictionary>;
+
+/// The kinds of value; none is the kind of a Value that holds nothing.
+enum class ValueKind : std::uint8_t { None, String, Integer, Real, Boolean, Date, Data, Array, Dictionary };
+
+/// A point in time as a property list carries it: whole seconds, UTC.
+using Date = std::chrono::sys_seconds;
+
+/// A property-list value: string, integer, real, boolean, date, data, array, dictionary, or none.
+///
+/// Scalars are held by value. Arrays and dictionaries are shared by reference: copying the Value gives a
+/// second reference to the same node, so that a decoder section and the display hold the same object.
+/// `copy()` gives an independent one. Main thread only, as everything that holds nodes.
+class Value {
+public:
+    using Kind = ValueKind;
+
+    Value() = default;
+    Value(std::string text) : _held(std::move(text)) {}
+    Value(std::string_view text) : _held(std::string(text)) {}
+    Value(const char* text) : _held(std::string(text)) {}
+    Value(std::same_as<bool> auto boolean) : _held(static_cast<bool>(boolean)) {}
+    template <std::integral Integer>
+    requires(!std::same_as<Integer, bool> && !std::same_as<Integer, char>) Value(Integer integer)
+        : _held(static_cast<std::int64_t>(integer)) {}
+    Value(double real) : _held(real) {}
+    Value(Date date) : _held(date) {}
+    Value(Data data) : _held(std::move(data)) {}
+    Value(ArrayRef array);
+    Value(DictionaryRef dictionary);
+
+    [[nodiscard]] Kind kind() const { return static_cast<Kind>(_held.index()); }
+    [[nodiscard]] bool isNone() const { return kind() == Kind::None; }
+
+    /// Each gives the held value, or null where the value is of another kind. Nothing is converted.
+    [[nodiscard]] const std::string* asString() const { return std::get_if<std::string>(&_held); }
+    [[nodiscard]] const std::int64_t* asInteger() const { return std::get_if<std::int64_t>(&_held); }
+    [[nodiscard]] const double* asReal() const { return std::get_if<double>(&_held); }
+    [[nodiscard]] const bool* asBoolean() const { return std::get_if<bool>(&_held); }
+    [[nodiscard]] const Date* asDate() const { return std::get_if<Date>(&_held); }
+    [[nodiscard]] const Data* asData() const { return std::get_if<Data>(&_held); }
+    /// The shared node itself, which may be changed through the pointer unless it is frozen.
+    [[nodiscard]] Array* asArray() const;
+    [[nodiscard]] Dictionary* asDictionary() const;
+    /// As above, with a share in the ownership; null where the value is of another kind.
+    [[nodiscard]] ArrayRef arrayRef() const;
+    [[nodiscard]] DictionaryRef dictionaryRef() const;
+
+    /// An independent, deep, frozen copy. Strings are copied, data is shared (it cannot change).
+    [[nodiscard]] Value copy() const;
+
+    /// Makes this a string with the given text; a string that is there already keeps its storage.
+    void setText(std::string_view text);
+
+    /// Deep equality: same kind, same content; arrays in order, dictionaries in any order.
+    friend bool operator==(const Value& a, const Value& b);
+
+private:
+    std::variant<std::monostate, std::string, std::int64_t, double, bool, Date, Data, ArrayRef, DictionaryRef>
+        _held;
+};
+
+/// The name of a kind as messages show it ("string", "array" ...).
+[[nodiscard]] std::string_view nameOf(Value::Kind kind);
+
+/// An ordered list of values. A frozen array (one made by `Value::copy`) throws std::logic_error when
+/// changed.
+class Array {
+public:
+    Array() = default;
+    Array(std::initializer_list<Value> values) : _values(values) {}
+
+    [[nodiscard]] std::size_t size() const { return _values.size(); }
+    [[nodiscard]] bool empty() const { return _values.empty(); }
+    /// Precondition: index < size().
+    [[nodiscard]] const Value& operator[](std::size_t index) const { return _values[index]; }
+    [[nodiscard]] auto begin() const { return _values.begin(); }
+    [[nodiscard]] auto end() const { return _values.end(); }
+
+    void append(Value value);
+    void clear();
+    /// Removes the first `count` values (all of them where there are fewer).
+    void removeFirst(std::size_t count);
+    void reserve(std::size_t count) { _values.reserve(count); }
+
+    [[nodiscard]] bool isFrozen() const { return _frozen; }
+
+private:
+    friend class Value;
+    void expectMutable() const;
+
+    std::vector<Value> _values;
+    bool _frozen = false;
+};
+
+/// String keys to values, kept in the order in which the keys were first set: templates and records are
+/// written in reading order, and so the screens show them. A frozen dictionary throws std::logic_error when
+/// changed. Look-up is linear while there are few keys and hashed from then on.
+class Dictionary {
+public:
+    struct Entry {
+        std::string key;
+        Value value;
+    };
+
+    Dictionary() = default;
+    /// Sets each entry in turn, so that a key given twice keeps its first place and its last value.
+    Dictionary(std::initializer_list<Entry> entries);
+
+    [[nodiscard]] std::size_t size() const { return _entries.size(); }
+    [[nodiscard]] bool empty() const { return _entries.empty(); }
+    [[nodiscard]] auto begin() const { return _entries.begin(); }
+    [[nodiscard]] auto end() const { return _entries.end(); }
+
+    /// The value under `key`, or null. Valid until the dictionary is changed.
+    [[nodiscard]] const Value* find(std::string_view key) const;
+    [[nodiscard]] bool contains(std::string_view key) const { return find(key) != nullptr; }
+    /// The value under `key`, or none.
+    [[nodiscard]] const Value& operator[](std::string_view key) const;
+
+    /// Stores the value; a key that is already there keeps its place in the order.
+    void set(std::string_view key, Value value);
+    /// `set` with a string, without giving up the storage of one that is there already.
+    void setText(std::string_view key, std::string_view text);
+    /// Whether there was such a key.
+    bool remove(std::string_view key);
+
+    [[nodiscard]] bool isFrozen() const { return _frozen; }
+
+private:
+    friend class Value;
+    struct Hash {
+        using is_transparent = void;
+        std::size_t operator()(std::string_view key) const { return std::hash<std::string_view>{}(key); }
+    };
+
+    [[nodiscard]] std::optional<std::size_t> indexOf(std::string_view key) const;
+    Value& slot(std::string_view key);
+    void rebuildIndex();
+    void expectMutable() const;
+
+    std::vector<Entry> _entries;
+    /// Key to place in `_entries`; empty while there are few entries.
+    std::unordered_map<std::string, std::size_t, Hash, std::equal_to<>> _index;
+    bool _frozen = false;
+};
+
+[[nodiscard]] inline ArrayRef makeArray() {
+    return std::make_shared<Array>();
+}
+[[nodiscard]] inline DictionaryRef makeDictionary() {
+    return std::make_shared<Dictionary>();
+}
+
+} // namespace velmora

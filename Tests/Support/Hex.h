@@ -1,0 +1,40 @@
+#pragma once
+
+#include "Platform/Bytes.h"
+#include "Platform/Value.h"
+
+#include <cstdint>
+#include <initializer_list>
+#include <string_view>
+
+/// Bytes for tests, written so that a reader sees the fields: hexadecimal text, and the log records made of
+/// it.
+
+namespace velmora {
+
+/// The bytes that the text spells: two hexadecimal digits a byte, in either case. White space between bytes
+/// is left out, and so is everything from "//" or "#" to the end of its line. Throws std::invalid_argument
+/// for anything else, a byte of one digit included.
+[[nodiscard]] Data hex(std::string_view text);
+
+/// A log record: the type, the length (of all that follows the type, 16 bits), the log code (16 bits), eight
+/// zero bytes, then the payload, which so begins at offset 13. Numbers are little-endian. Throws
+/// std::invalid_argument where the length does not fit.
+[[nodiscard]] Data recordOf(std::uint16_t code, Bytes payload, std::uint8_t type = 1);
+
+/// As `recordOf`, the payload given as `hex` takes it.
+[[nodiscard]] Data record(std::uint16_t code, std::string_view payloadHex, std::uint8_t type = 1);
+
+/// A record of the telephony service's extra stream (type 0xFF) whose payload is the value as an XML property
+/// list. Throws std::invalid_argument for a value that has no such form.
+[[nodiscard]] Data extraRecord(std::uint16_t code, const Value& plist);
+
+/// The parts one behind the other.
+[[nodiscard]] Data joined(std::initializer_list<Data> parts);
+
+template <class... Part>
+[[nodiscard]] Data joined(const Data& first, const Part&... others) {
+    return joined({first, others...});
+}
+
+} // namespace velmora

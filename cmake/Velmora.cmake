@@ -1,0 +1,66 @@
+# What every target of the project is built with, and the helpers that declare them.
+
+add_library(velmora_options INTERFACE)
+target_include_directories(velmora_options INTERFACE ${PROJECT_SOURCE_DIR})
+target_compile_options(velmora_options INTERFACE -Wall -Wextra -Wpedantic -Wshadow -Wconversion -Werror
+                       -fstack-protector-strong)
+target_link_options(velmora_options INTERFACE -Wl,-z,relro,-z,now)
+if(VELMORA_SANITIZE)
+    target_compile_options(velmora_options INTERFACE -fsanitize=address,undefined -fno-sanitize-recover=all
+                           -fno-omit-frame-pointer)
+    target_link_options(velmora_options INTERFACE -fsanitize=address,undefined)
+elseif(CMAKE_BUILD_TYPE MATCHES "Rel")
+    target_compile_options(velmora_options INTERFACE -U_FORTIFY_SOURCE -D_FORTIFY_SOURCE=2)
+endif()
+
+# velmora_library(NAME SOURCES file... [LINK target...]): a static library; what it links is all it may include.
+function(velmora_library name)
+    cmake_parse_arguments(PARSE_ARGV 1 arg "" "" "SOURCES;LINK")
+    add_library(${name} STATIC ${arg_SOURCES})
+    target_link_libraries(${name} PUBLIC velmora_options ${arg_LINK})
+endfunction()
+
+# velmora_test(NAME SOURCES file... [LINK target...] [NEEDS program...]): a GoogleTest executable whose cases
+# CTest runs one by one. NEEDS builds programs that the cases start, so that one target builds all a test needs.
+function(velmora_test name)
+    cmake_parse_arguments(PARSE_ARGV 1 arg "" "" "SOURCES;LINK;NEEDS")
+    add_executable(${name} ${arg_SOURCES})
+    set_target_properties(${name} PROPERTIES RUNTIME_OUTPUT_DIRECTORY ${CMAKE_BINARY_DIR}/tests)
+    target_link_libraries(${name} PRIVATE velmora_options ${arg_LINK} GTest::gtest GTest::gmock)
+    target_compile_definitions(${name} PRIVATE VELMORA_SOURCE_DIR="${PROJECT_SOURCE_DIR}"
+                               VELMORA_BUILD_DIR="${CMAKE_BINARY_DIR}")
+    if(arg_NEEDS)
+        add_dependencies(${name} ${arg_NEEDS})
+    endif()
+    include(GoogleTest)
+    gtest_discover_tests(${name} TEST_PREFIX "${name}." DISCOVERY_MODE PRE_TEST PROPERTIES TIMEOUT 60)
+endfunction()
+
+# velmora_benchmark(NAME SOURCES file... [LINK target...]): a Google Benchmark executable.
+function(velmora_benchmark name)
+    cmake_parse_arguments(PARSE_ARGV 1 arg "" "" "SOURCES;LINK")
+    add_executable(${name} ${arg_SOURCES})
+    set_target_properties(${name} PROPERTIES RUNTIME_OUTPUT_DIRECTORY ${CMAKE_BINARY_DIR}/benchmarks)
+    target_link_libraries(${name} PRIVATE velmora_options ${arg_LINK} benchmark::benchmark benchmark::benchmark_main)
+endfunction()
+
+# velmora_header_check(): compiles every header of the project that no source of the same name includes first, so
+# that each header is known to compile alone.
+function(velmora_header_check)
+    file(GLOB_RECURSE headers CONFIGURE_DEPENDS RELATIVE ${PROJECT_SOURCE_DIR}
+         ${PROJECT_SOURCE_DIR}/LogGenerator/*.h ${PROJECT_SOURCE_DIR}/Model/*.h ${PROJECT_SOURCE_DIR}/Platform/*.h
+         ${PROJECT_SOURCE_DIR}/Recording/*.h ${PROJECT_SOURCE_DIR}/Telephony/*.h ${PROJECT_SOURCE_DIR}/Tests/*.h
+         ${PROJECT_SOURCE_DIR}/Tools/*.h)
+    set(sources)
+    foreach(header IN LISTS headers)
+        string(REGEX REPLACE "\\.h$" ".cpp" source ${header})
+        if(NOT EXISTS ${PROJECT_SOURCE_DIR}/${source})
+            set(check ${CMAKE_BINARY_DIR}/header-check/${source})
+            file(CONFIGURE OUTPUT ${check} CONTENT "#include \"${header}\"\n")
+            list(APPEND sources ${check})
+        endif()
+    endforeach()
+    add_library(header-check OBJECT ${sources})
+    target_link_libraries(header-check PRIVATE velmora_options velmora_tools velmora_telephony velmora_test_support
+                          GTest::gtest GTest::gmock)
+endfunction()
