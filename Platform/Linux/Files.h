@@ -1,0 +1,19 @@
+#pragma once
+
+#include "Platform/Bytes.h"
+#include "Platform/Result.h"
+
+#include <cstddef>
+#include <filesystem>
+
+namespace velmora {
+
+/// The whole content of a file of at most `maximumBytes`. The reason does not name the file; it is ready to
+/// stand behind "file: ".
+Result<Data> readFile(const std::filesystem::path& path, std::size_t maximumBytes);
+
+/// Makes the file, or replaces its content, byte after byte: who reads it meanwhile sees part of it, and a
+/// failure leaves what was written up to then. The reason is as readFile's.
+Result<Done> writeFile(const std::filesystem::path& path, Bytes content);
+
+} // namespace velmora

@@ -1,0 +1,33 @@
+#pragma once
+
+#include <chrono>
+#include <functional>
+
+namespace velmora {
+
+/// A timer on the event loop, stopped until it is started. The owner may start, stop or destroy it from its
+/// own action. Its action runs at most once a turn of the loop, so that work cut into slices by a timer of no
+/// delay lets sockets, other timers and the screen have their turn in between. Main thread only.
+class LoopTimer {
+public:
+    explicit LoopTimer(std::function<void()> action);
+    ~LoopTimer();
+    LoopTimer(const LoopTimer&) = delete;
+    LoopTimer& operator=(const LoopTimer&) = delete;
+
+    /// Runs the action once when `delay` has passed, never earlier. Starting again begins anew.
+    void startOnce(std::chrono::nanoseconds delay);
+    /// Runs the action every `interval` (a millisecond at least). Missed ticks are not made up for.
+    void startRepeating(std::chrono::nanoseconds interval);
+    void stop();
+    [[nodiscard]] bool isRunning() const;
+
+private:
+    class Impl;
+    Impl* _impl;
+};
+
+/// The event loop's unit: whole milliseconds, rounded up, within what its timers can hold (24 days).
+[[nodiscard]] std::chrono::milliseconds loopMilliseconds(std::chrono::nanoseconds time);
+
+} // namespace velmora

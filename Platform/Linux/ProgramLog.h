@@ -1,0 +1,32 @@
+#pragma once
+
+#include "Platform/SystemLog.h"
+
+#include <memory>
+#include <optional>
+#include <string>
+#include <string_view>
+
+namespace velmora {
+
+/// Where a program sends its log lines: the values of `--log`.
+enum class LogKind { Syslog, Stderr };
+
+/// "syslog" or "stderr"; absent for anything else.
+[[nodiscard]] std::optional<LogKind> logKindNamed(std::string_view name);
+
+/// Puts a log of that kind in place for as long as it lives; after it lines go nowhere. This is what
+/// `--log` and `--log-level` ask for, held by `main` for the length of the program.
+class ProgramLog {
+public:
+    /// `level` is 0 to 7: lines whose priority is above it are left out. `identity` is the program's name.
+    ProgramLog(LogKind kind, int level, std::string identity);
+    ~ProgramLog();
+    ProgramLog(const ProgramLog&) = delete;
+    ProgramLog& operator=(const ProgramLog&) = delete;
+
+private:
+    std::unique_ptr<SystemLog> _log;
+};
+
+} // namespace velmora

@@ -1,0 +1,25 @@
+#include "Platform/Linux/SyslogLog.h"
+
+#include <syslog.h>
+
+#include <algorithm>
+#include <limits>
+#include <utility>
+
+namespace velmora {
+
+SyslogLog::SyslogLog(std::string identity) : _identity(std::move(identity)) {
+    ::openlog(_identity.c_str(), LOG_PID, LOG_USER);
+}
+
+SyslogLog::~SyslogLog() {
+    ::closelog();
+}
+
+void SyslogLog::write(int priority, std::string_view text) {
+    constexpr std::size_t longest = std::numeric_limits<int>::max();
+    ::syslog(priority & (LOG_PRIMASK | LOG_FACMASK), "%.*s", static_cast<int>(std::min(text.size(), longest)),
+             text.data());
+}
+
+} // namespace velmora
