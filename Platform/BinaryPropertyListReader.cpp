@@ -93,24 +93,15 @@ bool Reader::readObject(std::uint64_t index, std::size_t depth, Value& value) {
             break;
         value = object.marker == 0x09;
         return true;
-    case 0x1:
-        return readInteger(object, value);
-    case 0x2:
-        return readReal(object, value);
-    case 0x3:
-        return readDate(object, value);
-    case 0x4:
-        return readCount(object) && readData(object, value);
-    case 0x5:
-        return readCount(object) && readASCII(object, value);
-    case 0x6:
-        return readCount(object) && readUTF16(object, value);
-    case 0xA:
-        return readCount(object) && readArray(object, depth, value);
-    case 0xD:
-        return readCount(object) && readDictionary(object, depth, value);
-    default:
-        break;
+    case 0x1: return readInteger(object, value);
+    case 0x2: return readReal(object, value);
+    case 0x3: return readDate(object, value);
+    case 0x4: return readCount(object) && readData(object, value);
+    case 0x5: return readCount(object) && readASCII(object, value);
+    case 0x6: return readCount(object) && readUTF16(object, value);
+    case 0xA: return readCount(object) && readArray(object, depth, value);
+    case 0xD: return readCount(object) && readDictionary(object, depth, value);
+    default: break;
     }
     return failAt(object.offset, "marker " + hexByte(object.marker) + " stands for no value that is read");
 }

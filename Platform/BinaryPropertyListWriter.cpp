@@ -174,10 +174,8 @@ private:
             return writeText(*object.text);
         const Value& value = *object.value;
         switch (value.kind()) {
-        case Value::Kind::Integer:
-            return appendInteger(*value.asInteger());
-        case Value::Kind::Boolean:
-            return appendNumber(*value.asBoolean() ? 0x09 : 0x08, 1);
+        case Value::Kind::Integer: return appendInteger(*value.asInteger());
+        case Value::Kind::Boolean: return appendNumber(*value.asBoolean() ? 0x09 : 0x08, 1);
         case Value::Kind::Real:
             appendNumber(0x23, 1);
             return appendNumber(std::bit_cast<std::uint64_t>(*value.asReal()), 8);
@@ -199,8 +197,7 @@ private:
             appendMarker(0xD, value.asDictionary()->size());
             return appendReferences(object, 2 * value.asDictionary()->size());
         case Value::Kind::None:
-        case Value::Kind::String:
-            return; // refused, and written above
+        case Value::Kind::String: return; // refused, and written above
         }
     }
 

@@ -121,10 +121,8 @@ void LinuxLocalPort::acceptConnections() {
 bool LinuxLocalPort::handleAcceptError(int error) {
     switch (error) {
     case EINTR:
-    case ECONNABORTED:
-        return true;
-    case EAGAIN:
-        return false;
+    case ECONNABORTED: return true;
+    case EAGAIN: return false;
     case EMFILE:
     case ENFILE:
     case ENOBUFS:
@@ -170,16 +168,10 @@ void LinuxLocalPort::serveQueued() {
         _queued.pop_front();
         connection->queued = false;
         switch (serve(connection, budget, self)) {
-        case Served::Idle:
-            break;
-        case Served::More:
-            queue(connection);
-            break;
-        case Served::Closed:
-            drop(connection);
-            break;
-        case Served::PortGone:
-            return;
+        case Served::Idle: break;
+        case Served::More: queue(connection); break;
+        case Served::Closed: drop(connection); break;
+        case Served::PortGone: return;
         }
     }
     if (!_queued.empty())

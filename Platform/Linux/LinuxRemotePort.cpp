@@ -170,8 +170,7 @@ std::int32_t LinuxRemotePort::sendNow(const Frame& frame, Deadline deadline) {
             _blocked = false;
             _writeWatch->setEnabled(false);
             return PortStatus::Success;
-        case FrameQueue::Flushed::Some:
-            break;
+        case FrameQueue::Flushed::Some: break;
         case FrameQueue::Flushed::WouldBlock:
             if (waitFor(_socket.get(), POLLOUT, deadline))
                 break;
@@ -181,9 +180,7 @@ std::int32_t LinuxRemotePort::sendNow(const Frame& frame, Deadline deadline) {
             _blocked = true;
             _writeWatch->setEnabled(!_queue.empty());
             return PortStatus::SendTimeout;
-        case FrameQueue::Flushed::Broken:
-            connectionEnded();
-            return PortStatus::BecameInvalid;
+        case FrameQueue::Flushed::Broken: connectionEnded(); return PortStatus::BecameInvalid;
         }
     }
 }

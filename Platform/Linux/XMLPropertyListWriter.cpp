@@ -42,19 +42,11 @@ private:
             if (plain == std::string_view::npos)
                 break;
             switch (text[plain]) {
-            case '&':
-                _output += "&amp;";
-                break;
-            case '<':
-                _output += "&lt;";
-                break;
-            case '>':
-                _output += "&gt;";
-                break;
+            case '&': _output += "&amp;"; break;
+            case '<': _output += "&lt;"; break;
+            case '>': _output += "&gt;"; break;
             // A reader takes a bare carriage return for a line feed.
-            default:
-                _output += "&#13;";
-                break;
+            default: _output += "&#13;"; break;
             }
             text.remove_prefix(plain + 1);
         }
@@ -113,26 +105,18 @@ private:
 
     bool writeValue(const Value& value, std::size_t depth) {
         switch (value.kind()) {
-        case Value::Kind::String:
-            return writeText("string", *value.asString(), depth);
-        case Value::Kind::Integer:
-            return writeText("integer", std::to_string(*value.asInteger()), depth);
-        case Value::Kind::Real:
-            return writeText("real", xmlOfReal(*value.asReal()), depth);
-        case Value::Kind::Boolean:
-            return writeLine(*value.asBoolean() ? "<true/>" : "<false/>", depth);
+        case Value::Kind::String: return writeText("string", *value.asString(), depth);
+        case Value::Kind::Integer: return writeText("integer", std::to_string(*value.asInteger()), depth);
+        case Value::Kind::Real: return writeText("real", xmlOfReal(*value.asReal()), depth);
+        case Value::Kind::Boolean: return writeLine(*value.asBoolean() ? "<true/>" : "<false/>", depth);
         case Value::Kind::Date:
             if (!isPropertyListDate(*value.asDate()))
                 return fail("a date lies outside the years 0001 to 9999");
             return writeText("date", xmlOfDate(*value.asDate()), depth);
-        case Value::Kind::Data:
-            return writeData(value.asData()->bytes(), depth);
-        case Value::Kind::Array:
-            return writeArray(*value.asArray(), depth);
-        case Value::Kind::Dictionary:
-            return writeDictionary(*value.asDictionary(), depth);
-        case Value::Kind::None:
-            break;
+        case Value::Kind::Data: return writeData(value.asData()->bytes(), depth);
+        case Value::Kind::Array: return writeArray(*value.asArray(), depth);
+        case Value::Kind::Dictionary: return writeDictionary(*value.asDictionary(), depth);
+        case Value::Kind::None: break;
         }
         return fail("there is no value to write");
     }

@@ -1,0 +1,28 @@
+#pragma once
+
+#include "Platform/Bytes.h"
+#include "Platform/Clock.h"
+
+#include <cstdint>
+#include <optional>
+#include <string>
+
+namespace velmora {
+
+/// What a pcapng section says of one of its interfaces: what its packets are and how their time stamps count.
+struct InterfaceDescription {
+    std::uint16_t linkType = 0;
+    std::uint32_t snapLength = 0;    ///< bytes kept of a packet; 0 for no limit
+    std::string name;                ///< if_name, cut to 255 bytes; empty where there is none
+    std::uint8_t timeResolution = 6; ///< if_tsresol: negative power of ten, or of two with the top bit set
+    std::int64_t timeOffset_seconds = 0; ///< if_tsoffset
+
+    /// Reads the block's body; none where it is too short or an option does not fit.
+    [[nodiscard]] static std::optional<InterfaceDescription> read(Bytes body, bool bigEndian);
+
+    /// The moment that a packet's time stamp means, to the nanosecond below; none where it lies outside of
+    /// what `Time` can hold (the years 1678 to 2262).
+    [[nodiscard]] std::optional<Time> time(std::uint64_t stamp) const;
+};
+
+} // namespace velmora

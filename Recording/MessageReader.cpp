@@ -1,0 +1,12 @@
+#include "Recording/MessageReader.h"
+
+namespace velmora {
+
+void MessageReader::addLoss(Loss loss) {
+    ++_lossTotals.losses;
+    _lossTotals.bytes += loss.bytes;
+    if (keepsLoss())
+        _losses.push_back(std::move(loss));
+}
+
+} // namespace velmora

@@ -1,0 +1,76 @@
+#pragma once
+
+#include "Platform/Bytes.h"
+#include "Platform/Clock.h"
+#include "Platform/Result.h"
+
+#include <cstddef>
+#include <cstdint>
+#include <optional>
+#include <string>
+#include <utility>
+#include <vector>
+
+namespace velmora {
+
+/// The longest log message that a port takes, and so the longest in a recording, in bytes.
+inline constexpr std::size_t maximumMessageSize = std::size_t{16} << 20;
+
+/// One log message of a file.
+struct LoggedMessage {
+    Time time;                ///< when it arrived
+    Data message;             ///< exactly as it arrived at the port; may be a window on a larger buffer
+    std::uint64_t number = 0; ///< its place among the file's records, from 1, records that were lost included
+    std::uint64_t offset = 0; ///< where in the file its record begins, in bytes
+};
+
+/// Something in the file that gave no message though it should have.
+struct Loss {
+    std::uint64_t offset = 0; ///< where in the file it begins, in bytes
+    std::uint64_t bytes = 0;  ///< how many bytes of the file were left out
+    std::uint64_t recordNumber =
+        0;               ///< the lost record's number, or that of the next record where none is known
+    std::string reason;  ///< lower-case prose
+    bool isTail = false; ///< the file ends within a record, as when its writer was stopped
+};
+
+/// A file read as a stream of log messages, front to back, whatever its form. What cannot be read is left out
+/// and told as a loss; what follows it is still read. Main thread only.
+class MessageReader {
+public:
+    /// How many losses are kept one by one; the totals count them all.
+    static constexpr std::size_t maximumLosses = 100;
+
+    struct LossTotals {
+        std::uint64_t losses = 0;
+        std::uint64_t bytes = 0;
+    };
+
+    virtual ~MessageReader() = default;
+    MessageReader(const MessageReader&) = delete;
+    MessageReader& operator=(const MessageReader&) = delete;
+
+    /// The next message; none at the end of the file, or when reading failed (see `failure`), and ever after.
+    [[nodiscard]] virtual std::optional<LoggedMessage> next() = 0;
+    /// The short name of the technology whose messages these are ("Ostrel_GSM"); empty while it is unknown.
+    [[nodiscard]] virtual const std::string& technology() const = 0;
+    /// The read error that ended the stream early; absent when it ended with the file.
+    [[nodiscard]] virtual const std::optional<Failure>& failure() const = 0;
+
+    /// The first losses so far, in the file's order.
+    [[nodiscard]] const std::vector<Loss>& losses() const { return _losses; }
+    /// All losses so far.
+    [[nodiscard]] const LossTotals& lossTotals() const { return _lossTotals; }
+
+protected:
+    MessageReader() = default;
+    /// Whether the next loss will be kept, so that its reason is worth composing.
+    [[nodiscard]] bool keepsLoss() const { return _losses.size() < maximumLosses; }
+    void addLoss(Loss loss);
+
+private:
+    std::vector<Loss> _losses;
+    LossTotals _lossTotals;
+};
+
+} // namespace velmora

@@ -1,0 +1,46 @@
+#pragma once
+
+#include <cstddef>
+#include <cstdint>
+
+/// The words of the pcapng capture file format that recordings are written in. Every block is a type, a total
+/// length, a body padded to 32 bits, and the total length again, all in the byte order of its section.
+namespace velmora::pcapng {
+
+namespace BlockType {
+inline constexpr std::uint32_t SectionHeader = 0x0A0D0D0A; ///< reads the same in both byte orders
+inline constexpr std::uint32_t InterfaceDescription = 1;
+inline constexpr std::uint32_t Packet = 2; ///< obsolete, still met in old captures
+inline constexpr std::uint32_t SimplePacket = 3;
+inline constexpr std::uint32_t NameResolution = 4;
+inline constexpr std::uint32_t InterfaceStatistics = 5;
+inline constexpr std::uint32_t EnhancedPacket = 6;
+inline constexpr std::uint32_t SystemdJournal = 9;
+inline constexpr std::uint32_t DecryptionSecrets = 10;
+inline constexpr std::uint32_t Custom = 0x00000BAD;
+inline constexpr std::uint32_t CustomNotCopied = 0x40000BAD;
+} // namespace BlockType
+
+namespace Option {
+inline constexpr std::uint16_t End = 0;
+inline constexpr std::uint16_t SectionUserApplication = 4;
+inline constexpr std::uint16_t InterfaceName = 2;
+inline constexpr std::uint16_t TimeResolution = 9;
+inline constexpr std::uint16_t TimeOffset = 14;
+} // namespace Option
+
+/// The section header's third word, as its own section reads it.
+inline constexpr std::uint32_t byteOrderMagic = 0x1A2B3C4D;
+/// The first of the link types that are free for private use; an interface of log messages has it.
+inline constexpr std::uint16_t logMessageLinkType = 147;
+
+/// Type, length, and the length again.
+inline constexpr std::size_t blockOverhead = 12;
+/// Where a block's body begins.
+inline constexpr std::size_t bodyOffset = 8;
+
+[[nodiscard]] constexpr std::size_t padded(std::size_t length) {
+    return (length + 3) & ~std::size_t{3};
+}
+
+} // namespace velmora::pcapng
