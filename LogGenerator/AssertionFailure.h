@@ -1,0 +1,16 @@
+#pragma once
+
+#include <stdexcept>
+#include <string>
+
+namespace velmora {
+
+/// An assertion about what a serialized-object baseband sends that does not hold. Nothing catches it: it ends
+/// the program, naming the description, the source file and the line.
+class AssertionFailure : public std::logic_error {
+public:
+    AssertionFailure(const std::string& description, const std::string& file, int line)
+        : std::logic_error(description + " (" + file + ":" + std::to_string(line) + ")") {}
+};
+
+} // namespace velmora

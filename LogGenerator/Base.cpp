@@ -1,0 +1,111 @@
+#include "LogGenerator/Base.h"
+
+#include "LogGenerator/ArrayLock.h"
+#include "Platform/SystemLog.h"
+
+#include <iterator>
+#include <utility>
+
+namespace velmora {
+
+Base* Base::initWithDict(ClassDictionary& classDict, CodeDictionary& codeDict) {
+    classDict.insert_or_assign(std::string(getSectionName()), this);
+    updateLogCodeDict(codeDict);
+    return this;
+}
+
+void Base::updateSectionRef(const Value& node) {
+    _dictionaryRef = node.dictionaryRef();
+    _arrayRef = node.arrayRef();
+    logLine(LogPriority::Warning, getSectionName());
+}
+
+void Base::updateLogCodeDict(CodeDictionary& codeDict) {
+    const std::vector<std::uint32_t> codes = getLogCodeArray();
+    logFormat(LogPriority::Warning, "Array Count: %d", static_cast<int>(codes.size()));
+    for (const std::uint32_t code : codes)
+        codeDict[std::to_string(code)].push_back(this);
+}
+
+void Base::clearElementsInArray(Array& array) {
+    ArrayLock::Guard guard;
+    array.clear();
+}
+
+void Base::replaceArray(Array& array, const Array& newElements) {
+    ArrayLock::Guard guard;
+    array.clear();
+    array.reserve(newElements.size());
+    for (const Value& element : newElements)
+        array.append(element);
+}
+
+std::int16_t Base::lookUpECNO(std::uint32_t value) {
+    if (value >= 524288)
+        return 0;
+    // Entry i is the threshold above which the value is -(i + 1) dB. The last threshold gives -31 like the
+    // one before it: there is no -32.
+    static constexpr std::uint32_t thresholds[] = {
+        417647, 331808, 263624, 209463, 166441, 132268, 105123, 83562, 66435, 52830, 42023,
+        33440,  26621,  21205,  16903,  13486,  10771,  8615,   6902,  5542,  4461,  3603,
+        2921,   2240,   1949,   1607,   1336,   1120,   949,    813,   756,   705,
+    };
+    static_assert(std::size(thresholds) == 32);
+    for (std::size_t i = 0; i < std::size(thresholds); ++i)
+        if (value > thresholds[i])
+            return static_cast<std::int16_t>(i == 31 ? -31 : -1 - static_cast<int>(i));
+    return 0; // as for 0 dB and above, on purpose
+}
+
+void Base::setText(std::string_view label, std::string_view text) const {
+    if (const DictionaryRef node = dictionary())
+        node->setText(label, text);
+}
+
+void Base::setList(std::string_view label, Array list) const {
+    if (const DictionaryRef node = dictionary())
+        node->set(label, std::make_shared<Array>(std::move(list)));
+}
+
+bool Base::show(const Record& record, const Layout& layout) const {
+    if (record.size() < layout.minimumLength)
+        return false;
+    if (const DictionaryRef node = dictionary())
+        writeFields(*node, record, layout);
+    return true;
+}
+
+Array Base::rows(const CountedList& list, const Layout& layout, std::uint32_t logCode) {
+    reportMissingEntries(list, logCode);
+    Array result;
+    const std::size_t whole = list.whole();
+    result.reserve(whole);
+    for (std::size_t i = 0; i < whole; ++i) {
+        DictionaryRef row = makeDictionary();
+        writeFields(*row, list[i], layout);
+        result.append(std::move(row));
+    }
+    return result;
+}
+
+void Base::reportMissingEntries(const CountedList& list, std::uint32_t logCode) {
+    if (const std::size_t whole = list.whole(); whole < list.count())
+        logFormat(LogPriority::Error, "Record 0x%04X: %d of %d entries", logCode, static_cast<int>(whole),
+                  static_cast<int>(list.count()));
+}
+
+void Base::clearElements() const {
+    if (const ArrayRef node = array())
+        clearElementsInArray(*node);
+}
+
+void Base::replaceElements(const Array& newElements) const {
+    if (const ArrayRef node = array())
+        replaceArray(*node, newElements);
+}
+
+void Base::unknownLogMessage(std::uint32_t logCode) {
+    logFormat(LogPriority::Error, "Received an unknown log message: %d", static_cast<int>(logCode));
+}
+
+} // namespace velmora

@@ -1,0 +1,103 @@
+#pragma once
+
+#include "LogGenerator/Field.h"
+#include "LogGenerator/Record.h"
+#include "Platform/Value.h"
+
+#include <cstdint>
+#include <functional>
+#include <map>
+#include <memory>
+#include <string>
+#include <string_view>
+#include <vector>
+
+namespace velmora {
+
+class Base;
+
+/// Section name to section. The class index owns the sections.
+using ClassDictionary = std::map<std::string, Base*, std::less<>>;
+/// Log code as a decimal string ("53472") to the sections that want it, in the order of their registration.
+using CodeDictionary = std::map<std::string, std::vector<Base*>, std::less<>>;
+
+/// The extra stream's codes start here: 0xFF0000 plus the 16-bit code of the record.
+inline constexpr std::uint32_t firstExtraCode = 0xFF0000;
+
+/// A section: one block of the measurement screen. It names itself, lists the log codes that it wants, and
+/// writes display strings straight into its node of the display dictionary when one of their records arrives.
+/// The node is owned by the display; the section only refers to it. Main thread only.
+class Base {
+public:
+    virtual ~Base() = default;
+    Base(const Base&) = delete;
+    Base& operator=(const Base&) = delete;
+
+    /// Registers the finished section under its name and with each of its codes; returns the section. A
+    /// second section of the same name replaces the first in `classDict`.
+    Base* initWithDict(ClassDictionary& classDict, CodeDictionary& codeDict);
+
+    /// The section's display name, which is also the key of its node in the display template.
+    [[nodiscard]] virtual std::string_view getSectionName() const = 0;
+    /// The codes that the section wants, in the order in which they are registered; none for a section that
+    /// is only there to be shown.
+    [[nodiscard]] virtual std::vector<std::uint32_t> getLogCodeArray() const = 0;
+    /// Decodes one record (without the optional prefix) that was routed here under `logCode`. What is
+    /// malformed is logged and dropped, and the node keeps its earlier values.
+    virtual void updateWithData(const Data& data, std::uint32_t logCode) = 0;
+
+    /// Hands the section its node, a dictionary or an array.
+    void updateSectionRef(const Value& node);
+    /// Appends this section to the subscribers of each of its codes: a code listed twice is subscribed twice.
+    void updateLogCodeDict(CodeDictionary& codeDict);
+
+    /// Both rewrite the array under `ArrayLock`; the array object stays the same, so that the display keeps
+    /// pointing at it.
+    static void clearElementsInArray(Array& array);
+    static void replaceArray(Array& array, const Array& newElements);
+
+    /// Whole dB, 0 down to -31, of an unsigned linear Ec/No on a scale where 524288 (2^19) is 0 dB.
+    /// Thresholds of the modem's own table; its last two rows both give -31, and 705 and below give 0, on
+    /// purpose.
+    [[nodiscard]] static std::int16_t lookUpECNO(std::uint32_t value);
+
+protected:
+    Base() = default;
+
+    /// The node, null before the display is built and where it is of the other kind. A value written to no
+    /// node goes nowhere.
+    [[nodiscard]] DictionaryRef dictionary() const { return _dictionaryRef.lock(); }
+    [[nodiscard]] ArrayRef array() const { return _arrayRef.lock(); }
+
+    /// Writes one value into the dictionary node.
+    void setText(std::string_view label, std::string_view text) const;
+    void setText(std::string_view label, const NumberText& number) const { setText(label, number.text()); }
+
+    /// Puts a new array value into the dictionary node; one that the display held under the label stays
+    /// unchanged.
+    void setList(std::string_view label, Array list) const;
+
+    /// Writes all fields of the layout into the dictionary node, unless the record is shorter than its
+    /// minimum, which is ignored silently. Whether it was long enough.
+    bool show(const Record& record, const Layout& layout) const;
+
+    /// A new array of one dictionary per entry, made by `layout`. Where the count promises more entries than
+    /// the record holds, those that lie wholly inside are shown and one error line says so.
+    [[nodiscard]] static Array rows(const CountedList& list, const Layout& layout, std::uint32_t logCode);
+    /// That error line, where it is due.
+    static void reportMissingEntries(const CountedList& list, std::uint32_t logCode);
+
+    /// The array node emptied or refilled as above; nothing without a node.
+    void clearElements() const;
+    void replaceElements(const Array& newElements) const;
+
+    /// The error line for a code that the section does not handle.
+    static void unknownLogMessage(std::uint32_t logCode);
+
+private:
+    /// `sectionRef`: the one of the two that fits the node's kind. Weak, since the display owns the node.
+    std::weak_ptr<Dictionary> _dictionaryRef;
+    std::weak_ptr<Array> _arrayRef;
+};
+
+} // namespace velmora

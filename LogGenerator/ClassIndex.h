@@ -1,0 +1,43 @@
+#pragma once
+
+#include "LogGenerator/Base.h"
+
+#include <memory>
+#include <string>
+#include <string_view>
+#include <vector>
+
+namespace velmora {
+
+/// A technology's registry: section names to sections, and log codes to the sections that want them. A
+/// technology's subclass creates its sections, owns them, and does nothing else.
+class ClassIndex {
+public:
+    ClassIndex() = default;
+    /// Prints "Deallocing ClassIndex" on the console.
+    virtual ~ClassIndex();
+    ClassIndex(const ClassIndex&) = delete;
+    ClassIndex& operator=(const ClassIndex&) = delete;
+
+    /// The section registered under the name, or null.
+    [[nodiscard]] Base* getClass(std::string_view name) const;
+    /// The sections that want the code, in calling order; null when none does.
+    [[nodiscard]] const std::vector<Base*>* getSubscribers(std::uint32_t code) const;
+    /// Every wanted code as a decimal string.
+    [[nodiscard]] std::vector<std::string> getAllLogCodes() const;
+    /// Two log lines on what kind of object `classDict` is.
+    void status() const;
+
+    ClassDictionary classDict;
+    CodeDictionary codeDictionary;
+
+protected:
+    /// Creates a section in its field and registers it: one line a section in the subclass's constructor.
+    template <class Section>
+    void create(std::unique_ptr<Section>& field) {
+        field = std::make_unique<Section>();
+        field->initWithDict(classDict, codeDictionary);
+    }
+};
+
+} // namespace velmora

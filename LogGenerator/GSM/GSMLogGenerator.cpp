@@ -1,0 +1,83 @@
+#include "LogGenerator/GSM/GSMLogGenerator.h"
+
+#include "LogGenerator/AssertionFailure.h"
+#include "Platform/PropertyList.h"
+
+namespace velmora {
+
+namespace {
+
+// The lines are those that the assertions are known by, wherever they stand now.
+constexpr const char* assertionFile = "LogGenerator/GSM/GSMLogGenerator";
+constexpr int unknownObjectLine = 78;
+constexpr int notDeserializedLine = 90;
+
+/// The value of a one-entry dictionary, else the object itself.
+Value collapsed(const Value& object) {
+    const Dictionary* dictionary = object.asDictionary();
+    return dictionary && dictionary->size() == 1 ? dictionary->begin()->value : object;
+}
+
+} // namespace
+
+std::unique_ptr<GSMLogGenerator> GSMLogGenerator::generator(const Clock& clock) {
+    return std::make_unique<GSMLogGenerator>(clock);
+}
+
+Value GSMLogGenerator::processObject(const Value& object) {
+    switch (object.kind()) {
+    case Value::Kind::String: return object;
+    case Value::Kind::Dictionary: {
+        const DictionaryRef result = makeDictionary();
+        for (const auto& [key, value] : *object.asDictionary())
+            result->set(key, collapsed(processObject(value)));
+        return result;
+    }
+    case Value::Kind::Array: {
+        const ArrayRef result = makeArray();
+        for (const Value& element : *object.asArray())
+            result->append(collapsed(processObject(element)));
+        return result;
+    }
+    default:
+        throw AssertionFailure("Unknown object of type " + std::string(nameOf(object.kind())) +
+                                   " encountered",
+                               assertionFile, unknownObjectLine);
+    }
+}
+
+Value GSMLogGenerator::canCollapse(const Value& object) const {
+    const Dictionary* dictionary = object.asDictionary();
+    return dictionary && dictionary->size() == 1 ? dictionary->begin()->value : Value();
+}
+
+void GSMLogGenerator::updateState(Dictionary& state, const Data& data) {
+    Result<Value> object = readPropertyList(data.bytes());
+    if (!object)
+        throw AssertionFailure("Could not deserialize the object", assertionFile, notDeserializedLine);
+    Value display = processObject(*object);
+    state.set("DisplayState", *std::move(object));
+    state.set("Display", std::move(display));
+    state.set("ExtraInfo", makeDictionary());
+}
+
+Value GSMLogGenerator::generateLogUsingState(Dictionary& state) {
+    updateHistoryInState(state, clock());
+    return state["Display"];
+}
+
+DictionaryRef GSMLogGenerator::getStartCommand() const {
+    const DictionaryRef command = makeDictionary();
+    command->set("SetState", "Streaming");
+    return command;
+}
+
+ArrayRef GSMLogGenerator::getSaveContentsFromState(const Dictionary& state) const {
+    const ArrayRef contents = makeArray();
+    if (const Array* history = state["History"].asArray())
+        for (const Value& entry : *history)
+            contents->append(entry);
+    return contents;
+}
+
+} // namespace velmora

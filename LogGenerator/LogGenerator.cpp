@@ -1,0 +1,48 @@
+#include "LogGenerator/LogGenerator.h"
+
+#include "LogGenerator/GSM/GSMLogGenerator.h"
+#include "Platform/SystemLog.h"
+#include "Platform/TelephonyService.h"
+
+namespace velmora {
+
+namespace {
+
+/// The most entries that a history keeps when a new one is about to be added.
+constexpr std::int32_t keptBeforeNew = 4;
+
+} // namespace
+
+LogGenerator::LogGenerator(const Clock& clock) : _clock(clock) {
+    logFormat(LogPriority::Warning, "Creating Log object: %p", static_cast<void*>(this));
+}
+
+std::unique_ptr<LogGenerator> LogGenerator::generatorFromTechnology(std::string_view technology,
+                                                                    const Clock& clock) {
+    if (technology == kVoxLogChannelTechnology_IFX)
+        return GSMLogGenerator::generator(clock);
+    return nullptr;
+}
+
+void LogGenerator::updateHistoryInState(Dictionary& state, const Clock& clock) {
+    ArrayRef history = state["History"].arrayRef();
+    if (!history) {
+        history = makeArray();
+        state.set("History", history);
+    } else if (const auto count = static_cast<std::int32_t>(history->size()); count > keptBeforeNew) {
+        history->removeFirst(static_cast<std::size_t>(count - keptBeforeNew));
+    }
+
+    const DictionaryRef entry = makeDictionary();
+    history->append(entry);
+    for (const std::string_view key : {"DisplayState", "Display", "ExtraInfo"}) {
+        const Value& value = state[key];
+        if (value.isNone())
+            return; // the entry ends before the first missing value
+        entry->set(key, value.copy());
+    }
+    entry->set("Date", dateDescription(clock.now()));
+    entry->set("Description", "Snapshot (" + dateDescription(clock.now()) + ")");
+}
+
+} // namespace velmora

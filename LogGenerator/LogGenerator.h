@@ -1,0 +1,53 @@
+#pragma once
+
+#include "Platform/Clock.h"
+#include "Platform/Value.h"
+
+#include <memory>
+#include <string_view>
+
+namespace velmora {
+
+/// A technology's log decoder, as the model speaks to it. Decoders keep what they decode in the state
+/// dictionary that every call is given: the model owns it and it outlives them, so that a new decoder starts
+/// with what the earlier one left there. Main thread only.
+///
+/// State keys that every decoder uses: "Display" (the latest display dictionary), "DisplayState" (the raw
+/// material of the latest display), "ExtraInfo" (a dictionary of extra values), "History" (see
+/// updateHistoryInState).
+class LogGenerator {
+public:
+    /// `clock` dates the history and must outlive the decoder.
+    explicit LogGenerator(const Clock& clock);
+    virtual ~LogGenerator() = default;
+    LogGenerator(const LogGenerator&) = delete;
+    LogGenerator& operator=(const LogGenerator&) = delete;
+
+    /// Decodes one log message into the state. Called for every message.
+    virtual void updateState(Dictionary& state, const Data& data) = 0;
+    /// The display for the current state, or none when there is nothing to show yet; appends a history entry.
+    /// Called once per redraw with new data.
+    [[nodiscard]] virtual Value generateLogUsingState(Dictionary& state) = 0;
+    /// The property-list dictionary that makes the telephony service stream this technology's messages.
+    [[nodiscard]] virtual DictionaryRef getStartCommand() const = 0;
+    /// What a snapshot saves: dictionaries that each hold a "Description" string.
+    [[nodiscard]] virtual ArrayRef getSaveContentsFromState(const Dictionary& state) const = 0;
+
+    /// A new decoder for the technology that the telephony service names by one of its constants; null for
+    /// any other name, and where the decoder cannot be made.
+    [[nodiscard]] static std::unique_ptr<LogGenerator> generatorFromTechnology(std::string_view technology,
+                                                                               const Clock& clock);
+
+    /// Appends an entry to the state's "History", an array of at most 5, oldest first. An entry holds frozen
+    /// copies of "DisplayState", "Display" and "ExtraInfo", then "Date" and "Description", in this order, and
+    /// ends before the first that is missing, so that it never has a hole.
+    static void updateHistoryInState(Dictionary& state, const Clock& clock);
+
+protected:
+    [[nodiscard]] const Clock& clock() const { return _clock; }
+
+private:
+    const Clock& _clock;
+};
+
+} // namespace velmora

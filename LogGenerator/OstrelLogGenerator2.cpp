@@ -1,0 +1,193 @@
+#include "LogGenerator/OstrelLogGenerator2.h"
+
+#include "Platform/PropertyList.h"
+#include "Platform/Resources.h"
+#include "Platform/SystemLog.h"
+
+#include <charconv>
+
+namespace velmora {
+
+namespace {
+
+constexpr std::size_t headerLength = 13;
+constexpr std::size_t prefixLength = 2;
+constexpr std::uint8_t prefixMarker = 0x81;
+constexpr std::uint8_t basebandType = 1;
+constexpr std::uint8_t extraType = 0xFF;
+
+Value loadTemplate(const std::string& name) {
+    const Result<Data> file = resources().read(name, "plist");
+    if (!file) {
+        logFormat(LogPriority::Error, "%s", file.reason().c_str());
+        return {};
+    }
+    const Result<Value> root = readPropertyList(file->bytes());
+    if (!root) {
+        logFormat(LogPriority::Error, "%s.plist: %s", name.c_str(), root.reason().c_str());
+        return {};
+    }
+    if (!root->asDictionary()) {
+        logFormat(LogPriority::Error, "%s.plist: the root is of kind %s, wanted a dictionary", name.c_str(),
+                  std::string(nameOf(root->kind())).c_str());
+        return {};
+    }
+    return *root;
+}
+
+/// Announces the index before the base class announces the object.
+const Clock& announce(const ClassIndex& index, const Clock& clock) {
+    logFormat(LogPriority::Error, "Creating OstrelLogGenerator2 object with %p",
+              static_cast<const void*>(&index));
+    return clock;
+}
+
+} // namespace
+
+OstrelLogGenerator2::OstrelLogGenerator2(std::string plistName, std::shared_ptr<ClassIndex> index,
+                                         const Clock& clock)
+    : OstrelLogGenerator(announce(*index, clock)), pListName(std::move(plistName)), cIndex(std::move(index)) {
+    logFormat(LogPriority::Error, "Class Index: %ld", cIndex.use_count());
+}
+
+OstrelLogGenerator2::~OstrelLogGenerator2() {
+    // The same words for every technology.
+    logFormat(LogPriority::Warning, "Ostrel_GSMLogGenerator is destructed %p", static_cast<void*>(this));
+}
+
+void OstrelLogGenerator2::updateState(Dictionary& state, const Data& data) {
+    // Builds the display on the first message; what it returns is of no use here.
+    static_cast<void>(getDisplayFromState(state));
+    updateWithData(data);
+    // Every message is kept for the log, routed or not, with its prefix.
+    const Bytes bytes = data.bytes();
+    _binData.insert(_binData.end(), bytes.begin(), bytes.end());
+}
+
+void OstrelLogGenerator2::updateWithData(const Data& message) {
+    if (message.size() < headerLength)
+        return;
+    const Data data = message.bytes().front() == prefixMarker ? message.from(prefixLength) : message;
+    const Record record(data);
+    const std::uint8_t type = record.u8(0);
+    if (type != basebandType && type != extraType) {
+        logFormat(LogPriority::Error, "Invalid log type: %x. Dropping.", static_cast<unsigned>(type));
+        return;
+    }
+    const std::uint32_t code = record.u16(3) + (type == extraType ? firstExtraCode : 0);
+    if (const std::vector<Base*>* subscribers = cIndex->getSubscribers(code))
+        for (Base* section : *subscribers)
+            section->updateWithData(data, code);
+}
+
+Value OstrelLogGenerator2::getDisplayFromState(Dictionary& state) {
+    if (const Value& display = state["Display"]; !display.isNone()) {
+        if (!_sectionsHaveNodes)
+            adoptDisplay(display);
+        _sectionsHaveNodes = true;
+        return display;
+    }
+    if (state["Template"].isNone()) {
+        Value loaded = loadTemplate(pListName);
+        if (loaded.isNone()) {
+            logLine(LogPriority::Error, "Cannot load template for display");
+            return {};
+        }
+        state.set("Template", std::move(loaded));
+    }
+    logFormat(LogPriority::Warning, "Initialized class index: %p, Self: %p", static_cast<void*>(cIndex.get()),
+              static_cast<void*>(this));
+    cIndex->status();
+    const Value display = processTemplate(state["Template"]);
+    printDict(display);
+    state.set("Display", display);
+    state.set("ExtraInfo", makeDictionary());
+    _sectionsHaveNodes = true;
+    return {}; // not the display: see the header
+}
+
+void OstrelLogGenerator2::adoptDisplay(const Value& object) {
+    // The state outlives decoders. After a reconnection this decoder's sections have no nodes yet while the
+    // display of the earlier one is still shown: they go on in it, and nothing that it shows is lost.
+    if (const Dictionary* dictionary = object.asDictionary()) {
+        for (const auto& [key, value] : *dictionary) {
+            if (Base* section = cIndex->getClass(key))
+                section->updateSectionRef(value);
+            adoptDisplay(value);
+        }
+    } else if (const Array* array = object.asArray()) {
+        for (const Value& element : *array)
+            adoptDisplay(element);
+    }
+}
+
+Value OstrelLogGenerator2::processTemplate(const Value& object) {
+    switch (object.kind()) {
+    case Value::Kind::String: return object;
+    case Value::Kind::Array: {
+        ArrayRef result = makeArray();
+        for (const Value& element : *object.asArray())
+            if (Value processed = processTemplate(element); !processed.isNone())
+                result->append(std::move(processed));
+        return result;
+    }
+    case Value::Kind::Dictionary: {
+        DictionaryRef result = makeDictionary();
+        // Keys are strings by construction: the property-list reader refuses any other.
+        for (const auto& [key, value] : *object.asDictionary()) {
+            Value processed = processTemplate(value);
+            if (processed.isNone())
+                continue; // a foreign kind has been reported; its key is left out
+            if (Base* section = cIndex->getClass(key))
+                section->updateSectionRef(processed);
+            result->set(key, std::move(processed));
+        }
+        return result;
+    }
+    default:
+        logLine(LogPriority::Error, "Received an object of unknown type");
+        logLine(LogPriority::Warning, "Processing the template");
+        return {};
+    }
+}
+
+void OstrelLogGenerator2::printDict(const Value& object) const {
+    if (object.asString())
+        return;
+    if (const Dictionary* dictionary = object.asDictionary()) {
+        for (const auto& [key, value] : *dictionary)
+            printDict(value);
+    } else if (const Array* array = object.asArray()) {
+        for (const Value& element : *array)
+            printDict(element);
+    } else {
+        logLine(LogPriority::Error, "Received an object of unknown type");
+    }
+}
+
+Value OstrelLogGenerator2::generateLogUsingState(Dictionary& state) {
+    Value display = getDisplayFromState(state);
+    handOverBinData(state);
+    updateHistoryInState(state, clock());
+    return display;
+}
+
+DictionaryRef OstrelLogGenerator2::getStartCommand() const {
+    const ArrayRef logCodes = makeArray();
+    const ArrayRef extraCodes = makeArray();
+    for (const std::string& key : cIndex->getAllLogCodes()) {
+        std::uint32_t code = 0;
+        std::from_chars(key.data(), key.data() + key.size(), code);
+        if (code >= firstExtraCode)
+            extraCodes->append(code - firstExtraCode);
+        else
+            logCodes->append(code);
+    }
+    const DictionaryRef command = makeDictionary();
+    command->set("SetState", "Streaming");
+    command->set("SetOstrelLogCodes", logCodes);
+    command->set("SetVoxExtraCodes", extraCodes);
+    return command;
+}
+
+} // namespace velmora

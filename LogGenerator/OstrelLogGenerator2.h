@@ -1,0 +1,53 @@
+#pragma once
+
+#include "LogGenerator/ClassIndex.h"
+#include "LogGenerator/OstrelLogGenerator.h"
+
+#include <memory>
+#include <string>
+
+namespace velmora {
+
+/// The template-driven decoder of the binary families. It builds the display from its template once per state
+/// and hands every section its node, frames each log message and routes it by log code to the sections that
+/// want it, and moves the raw messages into the history at each refresh. A technology's subclass only chooses
+/// the template and the class index.
+///
+/// State keys beside LogGenerator's: "Template", the template as it was loaded.
+class OstrelLogGenerator2 : public OstrelLogGenerator {
+public:
+    /// `plistName`: the template's resource name without extension.
+    OstrelLogGenerator2(std::string plistName, std::shared_ptr<ClassIndex> index, const Clock& clock);
+    ~OstrelLogGenerator2() override;
+
+    void updateState(Dictionary& state, const Data& data) override;
+    [[nodiscard]] Value generateLogUsingState(Dictionary& state) override;
+    [[nodiscard]] DictionaryRef getStartCommand() const override;
+
+    /// Frames one message and routes its record. A message below 13 bytes as it arrived is dropped silently;
+    /// a prefix (first byte 0x81, two bytes) is removed; so a prefixed message of 13 bytes gives a record of
+    /// 11, which each section then finds too short.
+    void updateWithData(const Data& message);
+
+    /// A copy of the template in which every section holds its own node; none for a foreign kind of value.
+    [[nodiscard]] Value processTemplate(const Value& object);
+
+    /// Walks a display and logs every value that is no string, array or dictionary.
+    void printDict(const Value& object) const;
+
+    /// The state's display, or none. The call that builds the display returns none, not the display: callers
+    /// take that as nothing to show yet. That is meant.
+    [[nodiscard]] Value getDisplayFromState(Dictionary& state);
+
+    [[nodiscard]] const ClassIndex& classIndex() const { return *cIndex; }
+
+private:
+    /// Gives the sections of this decoder their nodes of a display that an earlier decoder built.
+    void adoptDisplay(const Value& display);
+
+    std::string pListName;
+    std::shared_ptr<ClassIndex> cIndex;
+    bool _sectionsHaveNodes = false;
+};
+
+} // namespace velmora

@@ -1,0 +1,15 @@
+#include "LogGenerator/PDPContextList.h"
+
+#include "LogGenerator/ExtraPayload.h"
+#include "Platform/SystemLog.h"
+
+namespace velmora {
+
+void PDPContextList::updateWithData(const Data& data, std::uint32_t) {
+    logLine(LogPriority::Warning, "PDPContextList");
+    const ContextListReader reader(data);
+    if (const Array* contexts = reader.contexts())
+        replaceElements(*contexts);
+}
+
+} // namespace velmora

@@ -1,0 +1,171 @@
+#include "LogGenerator/Base.h"
+
+#include "Tests/Support/CapturedLog.h"
+#include "Tests/Support/Hex.h"
+
+#include <gmock/gmock.h>
+#include <gtest/gtest.h>
+
+namespace velmora {
+namespace {
+
+using testing::ElementsAre;
+using testing::Pair;
+
+class Probe final : public Base {
+public:
+    Probe(std::string name, std::vector<std::uint32_t> codes)
+        : _name(std::move(name)), _codes(std::move(codes)) {}
+    std::string_view getSectionName() const override { return _name; }
+    std::vector<std::uint32_t> getLogCodeArray() const override { return _codes; }
+    void updateWithData(const Data&, std::uint32_t) override {}
+
+    using Base::array;
+    using Base::clearElements;
+    using Base::dictionary;
+    using Base::replaceElements;
+    using Base::rows;
+    using Base::setText;
+    using Base::show;
+
+private:
+    std::string _name;
+    std::vector<std::uint32_t> _codes;
+};
+
+TEST(BaseTest, RegistersUnderItsNameAndEachCode) {
+    ClassDictionary classes;
+    CodeDictionary codes;
+    const CapturedLog log;
+    Probe probe("RRC Info", {0xD0E0, 0xFF0000});
+    EXPECT_EQ(probe.initWithDict(classes, codes), &probe);
+    EXPECT_THAT(classes, ElementsAre(Pair("RRC Info", &probe)));
+    EXPECT_THAT(codes,
+                ElementsAre(Pair("16711680", ElementsAre(&probe)), Pair("53472", ElementsAre(&probe))));
+    EXPECT_THAT(log.lines(), ElementsAre(CapturedLog::Line{LogPriority::Warning, "Array Count: 2"}));
+}
+
+TEST(BaseTest, SubscribersStandInTheOrderOfTheirRegistration) {
+    ClassDictionary classes;
+    CodeDictionary codes;
+    Probe second("B", {7});
+    Probe first("A", {7, 7}); // a code listed twice is subscribed twice
+    second.initWithDict(classes, codes);
+    first.initWithDict(classes, codes);
+    EXPECT_THAT(codes["7"], ElementsAre(&second, &first, &first));
+}
+
+TEST(BaseTest, SecondSectionOfANameReplacesTheFirst) {
+    ClassDictionary classes;
+    CodeDictionary codes;
+    Probe first("A", {1});
+    Probe second("A", {1});
+    first.initWithDict(classes, codes);
+    second.initWithDict(classes, codes);
+    EXPECT_THAT(classes, ElementsAre(Pair("A", &second)));
+    EXPECT_THAT(codes["1"], ElementsAre(&first, &second));
+}
+
+TEST(BaseTest, NodeIsReferredToNotOwned) {
+    Probe probe("RRC Info", {});
+    const CapturedLog log;
+    DictionaryRef node = makeDictionary();
+    probe.updateSectionRef(node);
+    EXPECT_THAT(log.lines(), ElementsAre(CapturedLog::Line{LogPriority::Warning, "RRC Info"}));
+    probe.setText("State", "Idle");
+    EXPECT_EQ((*node)["State"], Value("Idle"));
+    EXPECT_EQ(probe.array(), nullptr);
+    node.reset();
+    EXPECT_EQ(probe.dictionary(), nullptr);
+    probe.setText("State", "Gone"); // goes nowhere
+}
+
+TEST(BaseTest, WithoutANodeAllWritingGoesNowhere) {
+    Probe probe("X", {});
+    probe.setText("A", "1");
+    probe.clearElements();
+    probe.replaceElements(Array{"1"});
+    probe.updateSectionRef("a string is no node");
+    probe.setText("A", "1");
+    EXPECT_EQ(probe.dictionary(), nullptr);
+    EXPECT_EQ(probe.array(), nullptr);
+}
+
+TEST(BaseTest, ArraysAreRewrittenInPlace) {
+    const ArrayRef node = std::make_shared<Array>(std::initializer_list<Value>{"old", "older"});
+    Base::replaceArray(*node, Array{"new"});
+    EXPECT_EQ(*node->begin(), Value("new"));
+    EXPECT_EQ(node->size(), 1u);
+    Base::replaceArray(*node, Array());
+    EXPECT_TRUE(node->empty());
+    Base::replaceArray(*node, Array{"x"});
+    Base::clearElementsInArray(*node);
+    EXPECT_TRUE(node->empty());
+}
+
+constexpr Field oneByte[] = {{"Value", u8At(0), integer("%d")}};
+constexpr Layout entry = layout(1, oneByte);
+
+TEST(BaseTest, RowsEndWithTheRecordAndSayWhatIsMissing) {
+    const CapturedLog log;
+    const Data data = hex("05 06");
+    const Array rows = Probe::rows(CountedList(Record(data), 0, 1, 3), entry, 0x7150);
+    ASSERT_EQ(rows.size(), 2u);
+    EXPECT_EQ((*rows[1].asDictionary())["Value"], Value("6"));
+    EXPECT_THAT(log.lines(),
+                ElementsAre(CapturedLog::Line{LogPriority::Error, "Record 0x7150: 2 of 3 entries"}));
+}
+
+TEST(BaseTest, RowsThatAreAllThereSayNothing) {
+    const CapturedLog log;
+    const Data data = hex("05 06");
+    EXPECT_EQ(Probe::rows(CountedList(Record(data), 0, 1, 2), entry, 0x7150).size(), 2u);
+    EXPECT_THAT(log.lines(), ElementsAre());
+}
+
+TEST(BaseTest, ShowLeavesAShortRecordAlone) {
+    Probe probe("X", {});
+    const DictionaryRef node = makeDictionary();
+    probe.updateSectionRef(node);
+    const Data empty;
+    EXPECT_FALSE(probe.show(Record(empty), entry));
+    EXPECT_TRUE(node->empty());
+    EXPECT_TRUE(probe.show(Record(hex("09")), entry));
+    EXPECT_EQ((*node)["Value"], Value("9"));
+}
+
+struct EcNo {
+    std::uint32_t value;
+    int dB;
+};
+
+class LookUpECNOTest : public testing::TestWithParam<EcNo> {};
+
+TEST_P(LookUpECNOTest, GivesWholeDecibels) {
+    EXPECT_EQ(Base::lookUpECNO(GetParam().value), GetParam().dB);
+}
+
+// Each row of the table just above its threshold, and the threshold itself, which belongs to the next row.
+INSTANTIATE_TEST_SUITE_P(
+    Rows, LookUpECNOTest,
+    testing::Values(EcNo{0xFFFFFFFF, 0}, EcNo{524289, 0}, EcNo{524288, 0}, EcNo{524287, -1}, EcNo{417648, -1},
+                    EcNo{417647, -2}, EcNo{331809, -2}, EcNo{331808, -3}, EcNo{263625, -3}, EcNo{263624, -4},
+                    EcNo{209464, -4}, EcNo{209463, -5}, EcNo{166442, -5}, EcNo{166441, -6}, EcNo{132269, -6},
+                    EcNo{132268, -7}, EcNo{105124, -7}, EcNo{105123, -8}, EcNo{83563, -8}, EcNo{83562, -9},
+                    EcNo{66436, -9}, EcNo{66435, -10}, EcNo{52831, -10}, EcNo{52830, -11}, EcNo{42024, -11},
+                    EcNo{42023, -12}, EcNo{33441, -12}, EcNo{33440, -13}, EcNo{26622, -13}, EcNo{26621, -14},
+                    EcNo{21206, -14}, EcNo{21205, -15}, EcNo{16904, -15}, EcNo{16903, -16}, EcNo{13487, -16},
+                    EcNo{13486, -17}));
+INSTANTIATE_TEST_SUITE_P(LowRows, LookUpECNOTest,
+                         testing::Values(EcNo{10772, -17}, EcNo{10771, -18}, EcNo{8616, -18}, EcNo{8615, -19},
+                                         EcNo{6903, -19}, EcNo{6902, -20}, EcNo{5543, -20}, EcNo{5542, -21},
+                                         EcNo{4462, -21}, EcNo{4461, -22}, EcNo{3604, -22}, EcNo{3603, -23},
+                                         EcNo{2922, -23}, EcNo{2921, -24}, EcNo{2241, -24}, EcNo{2240, -25},
+                                         EcNo{1950, -25}, EcNo{1949, -26}, EcNo{1608, -26}, EcNo{1607, -27},
+                                         EcNo{1337, -27}, EcNo{1336, -28}, EcNo{1121, -28}, EcNo{1120, -29},
+                                         EcNo{950, -29}, EcNo{949, -30}, EcNo{814, -30}, EcNo{813, -31},
+                                         EcNo{757, -31}, EcNo{756, -31}, EcNo{706, -31}, EcNo{705, 0},
+                                         EcNo{1, 0}, EcNo{0, 0}));
+
+} // namespace
+} // namespace velmora

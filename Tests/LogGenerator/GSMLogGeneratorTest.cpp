@@ -1,0 +1,138 @@
+#include "LogGenerator/GSM/GSMLogGenerator.h"
+
+#include "LogGenerator/AssertionFailure.h"
+#include "Platform/PropertyList.h"
+#include "Tests/Support/FakeClock.h"
+
+#include <gmock/gmock.h>
+#include <gtest/gtest.h>
+
+namespace velmora {
+namespace {
+
+DictionaryRef dictionary(std::initializer_list<Dictionary::Entry> entries) {
+    return std::make_shared<Dictionary>(entries);
+}
+
+ArrayRef array(std::initializer_list<Value> values) {
+    return std::make_shared<Array>(values);
+}
+
+struct Folding {
+    const char* odd;
+    Value object;
+    Value display;
+};
+
+class ProcessObjectTest : public testing::TestWithParam<Folding> {};
+
+TEST_P(ProcessObjectTest, FoldsOneEntryDictionariesBelowTheRoot) {
+    EXPECT_EQ(GSMLogGenerator::processObject(GetParam().object), GetParam().display);
+}
+
+INSTANTIATE_TEST_SUITE_P(
+    , ProcessObjectTest,
+    testing::Values(
+        Folding{"String", "text", "text"},
+        Folding{"Child", dictionary({{"Cell", dictionary({{"ARFCN", "12"}})}}), dictionary({{"Cell", "12"}})},
+        Folding{"RootStays", dictionary({{"A", "1"}}), dictionary({{"A", "1"}})},
+        Folding{"TwoEntriesStay", dictionary({{"A", "1"}, {"B", "2"}}), dictionary({{"A", "1"}, {"B", "2"}})},
+        Folding{"TwoEntriesBelowStay", dictionary({{"X", dictionary({{"A", "1"}, {"B", "2"}})}}),
+                dictionary({{"X", dictionary({{"A", "1"}, {"B", "2"}})}})},
+        Folding{"ChainFoldsWhole",
+                dictionary({{"W", dictionary({{"X", dictionary({{"Y", dictionary({{"Z", "1"}})}})}})}}),
+                dictionary({{"W", "1"}})},
+        Folding{"ChainEndingInTwoEntries",
+                dictionary({{"W", dictionary({{"X", dictionary({{"A", "1"}, {"B", "2"}})}})}}),
+                dictionary({{"W", dictionary({{"A", "1"}, {"B", "2"}})}})},
+        Folding{"ArrayElement", array({dictionary({{"A", "1"}}), "2"}), array({"1", "2"})},
+        Folding{"ArrayBelowADictionary", dictionary({{"X", dictionary({{"Cells", array({"1"})}})}}),
+                dictionary({{"X", array({"1"})}})},
+        Folding{"EmptyDictionary", dictionary({{"X", makeDictionary()}}),
+                dictionary({{"X", makeDictionary()}})}),
+    [](const auto& test) { return std::string(test.param.odd); });
+
+class GSMLogGeneratorTest : public testing::Test {
+protected:
+    void update(const Value& value) {
+        const auto text = writeXMLPropertyList(value);
+        ASSERT_TRUE(text) << text.reason();
+        generator.updateState(state, Data(std::vector<std::uint8_t>(text->begin(), text->end())));
+    }
+
+    FakeClock clock;
+    GSMLogGenerator generator{clock};
+    Dictionary state;
+};
+
+TEST_F(GSMLogGeneratorTest, EachMessageReplacesTheWholeDisplay) {
+    update(dictionary({{"Old", "1"}, {"Older", "2"}}));
+    update(dictionary({{"Cell", dictionary({{"ARFCN", "12"}})}}));
+    EXPECT_EQ(state["DisplayState"], Value(dictionary({{"Cell", dictionary({{"ARFCN", "12"}})}})));
+    EXPECT_EQ(state["Display"], Value(dictionary({{"Cell", "12"}})));
+    EXPECT_EQ(state["ExtraInfo"], Value(makeDictionary()));
+}
+
+TEST_F(GSMLogGeneratorTest, ReadsTheBinaryForm) {
+    const auto binary = writeBinaryPropertyList(dictionary({{"A", "1"}}));
+    ASSERT_TRUE(binary);
+    generator.updateState(state, Data::copyOf(*binary));
+    EXPECT_EQ(state["Display"], Value(dictionary({{"A", "1"}})));
+}
+
+TEST_F(GSMLogGeneratorTest, RefreshReturnsTheDisplayAndKeepsHistory) {
+    update(dictionary({{"A", "1"}}));
+    EXPECT_EQ(generator.generateLogUsingState(state), Value(dictionary({{"A", "1"}})));
+    ASSERT_EQ(state["History"].asArray()->size(), 1u);
+    const ArrayRef contents = generator.getSaveContentsFromState(state);
+    EXPECT_EQ(contents->size(), 1u); // no DLF log
+    EXPECT_NE(contents.get(), state["History"].asArray());
+}
+
+TEST_F(GSMLogGeneratorTest, RefreshBeforeAnyMessageShowsNothing) {
+    EXPECT_TRUE(generator.generateLogUsingState(state).isNone());
+    EXPECT_TRUE((*state["History"].asArray())[0].asDictionary()->empty());
+}
+
+TEST_F(GSMLogGeneratorTest, StartCommandIsOneEntry) {
+    EXPECT_EQ(Value(generator.getStartCommand()), Value(dictionary({{"SetState", "Streaming"}})));
+}
+
+TEST_F(GSMLogGeneratorTest, CollapsesAloneTheOneEntryDictionary) {
+    EXPECT_EQ(generator.canCollapse(dictionary({{"A", "1"}})), Value("1"));
+    EXPECT_TRUE(generator.canCollapse(dictionary({{"A", "1"}, {"B", "2"}})).isNone());
+    EXPECT_TRUE(generator.canCollapse(makeDictionary()).isNone());
+    EXPECT_TRUE(generator.canCollapse(array({"1"})).isNone());
+    EXPECT_TRUE(generator.canCollapse("1").isNone());
+}
+
+TEST_F(GSMLogGeneratorTest, ForeignKindIsAnAssertionFailure) {
+    try {
+        update(dictionary({{"Cells", array({dictionary({{"ARFCN", 12}, {"B", "2"}})})}}));
+        FAIL() << "nothing was raised";
+    } catch (const AssertionFailure& failure) {
+        EXPECT_STREQ(failure.what(),
+                     "Unknown object of type integer encountered (LogGenerator/GSM/GSMLogGenerator:78)");
+    }
+}
+
+TEST_F(GSMLogGeneratorTest, UnreadableMessageIsAnAssertionFailure) {
+    try {
+        generator.updateState(state, Data());
+        FAIL() << "nothing was raised";
+    } catch (const AssertionFailure& failure) {
+        EXPECT_STREQ(failure.what(),
+                     "Could not deserialize the object (LogGenerator/GSM/GSMLogGenerator:90)");
+    }
+    EXPECT_TRUE(state.empty());
+}
+
+TEST_F(GSMLogGeneratorTest, BothAssertionFailuresEndTheProgramWithTheirWords) {
+    EXPECT_DEATH([this]() noexcept { generator.updateState(state, Data()); }(),
+                 "Could not deserialize the object \\(LogGenerator/GSM/GSMLogGenerator:90\\)");
+    EXPECT_DEATH([]() noexcept { static_cast<void>(GSMLogGenerator::processObject(7)); }(),
+                 "Unknown object of type integer encountered \\(LogGenerator/GSM/GSMLogGenerator:78\\)");
+}
+
+} // namespace
+} // namespace velmora
