@@ -1,6 +1,7 @@
 #include "LogGenerator/LogGenerator.h"
 
 #include "LogGenerator/GSM/GSMLogGenerator.h"
+#include "LogGenerator/OstrelGSM/Ostrel_GSMLogGenerator.h"
 #include "Platform/SystemLog.h"
 #include "Platform/TelephonyService.h"
 
@@ -21,6 +22,8 @@ std::unique_ptr<LogGenerator> LogGenerator::generatorFromTechnology(std::string_
                                                                     const Clock& clock) {
     if (technology == kVoxLogChannelTechnology_IFX)
         return GSMLogGenerator::generator(clock);
+    if (technology == kVoxLogChannelTechnology_Ostrel_GSM)
+        return Ostrel_GSMLogGenerator::generator(clock);
     return nullptr;
 }
 

@@ -1,0 +1,49 @@
+#include "LogGenerator/OstrelGSM/ActiveSet.h"
+
+#include "LogGenerator/OstrelGSM/SearcherRecord.h"
+#include "Platform/SystemLog.h"
+
+namespace velmora {
+
+using OstrelGSM::SearcherRecord;
+
+namespace {
+
+constexpr std::int64_t activeSet = 0;
+
+DictionaryRef row(const Record& cell, const Record& measurement, int power) {
+    const int ecNo = Base::lookUpECNO(SearcherRecord::energy(measurement));
+    const int rssi = (power + 512) / 10 - 106; // rounded toward zero
+    DictionaryRef result = makeDictionary();
+    writeValue(*result, "Scrambling Code", integer("%d"), SearcherRecord::scramblingCode.read(cell));
+    // A level, whose unit is shown so all the same.
+    writeValue(*result, "RSCP", integer("%d dB"), rssi + ecNo);
+    writeValue(*result, "Energy Per Chip", integer("%d dB"), ecNo);
+    return result;
+}
+
+} // namespace
+
+void ActiveSet::updateWithData(const Data& data, std::uint32_t logCode) {
+    logLine(LogPriority::Warning, "ActiveSet");
+    if (logCode != SearcherRecord::code) {
+        unknownLogMessage(logCode);
+        return;
+    }
+    const Record record(data);
+    if (record.size() < SearcherRecord::minimumLength)
+        return;
+    clearElements();
+    const SearcherRecord searcher(record);
+    if (searcher.cells().count() == 0)
+        return;
+    // The measurements lie behind the cells: one that lies wholly inside the record has its cell there too.
+    reportMissingEntries(searcher.measurements(), logCode);
+    Array rows;
+    for (std::size_t i = 0; i < searcher.measurements().whole(); ++i)
+        if (const Record cell = searcher.cells()[i]; SearcherRecord::setType.read(cell) == activeSet)
+            rows.append(row(cell, searcher.measurements()[i], searcher.power()));
+    replaceElements(rows);
+}
+
+} // namespace velmora

@@ -1,0 +1,34 @@
+#include "LogGenerator/OstrelGSM/MobileAllocation.h"
+
+#include "Platform/SystemLog.h"
+
+namespace velmora {
+
+namespace {
+
+constexpr Field hoppingFields[] = {
+    {"HSN", u8At(13), integer("%d")},
+};
+constexpr Layout hopping = layout(15, hoppingFields); // 0x51F8; the count at 14 and the ARFCNs follow
+constexpr std::size_t arfcnLength = 2;
+
+} // namespace
+
+void MobileAllocation::updateWithData(const Data& data, std::uint32_t logCode) {
+    logLine(LogPriority::Warning, "MobileAllocation");
+    if (logCode != 0x51F8) {
+        unknownLogMessage(logCode);
+        return;
+    }
+    const Record record(data);
+    if (!show(record, hopping))
+        return;
+    const CountedList entries(record, hopping.minimumLength, arfcnLength, record.u8(14));
+    reportMissingEntries(entries, logCode);
+    Array arfcns;
+    for (std::size_t i = 0; i < entries.whole(); ++i)
+        arfcns.append(NumberText("%d", std::int64_t{entries[i].u16(0)}).text());
+    setList("ARFCNs", std::move(arfcns));
+}
+
+} // namespace velmora

@@ -1,0 +1,15 @@
+#pragma once
+
+#include "LogGenerator/OstrelLogGenerator2.h"
+
+namespace velmora {
+
+/// The decoder of the technology Ostrel GSM (GSM and UMTS): the template "Ostrel_GSM" with its class index.
+class Ostrel_GSMLogGenerator final : public OstrelLogGenerator2 {
+public:
+    explicit Ostrel_GSMLogGenerator(const Clock& clock);
+    ~Ostrel_GSMLogGenerator() override;
+    [[nodiscard]] static std::unique_ptr<Ostrel_GSMLogGenerator> generator(const Clock& clock);
+};
+
+} // namespace velmora

@@ -1,0 +1,78 @@
+#include "LogGenerator/OstrelGSM/UMTSSet.h"
+
+#include "LogGenerator/ExtraPayload.h"
+#include "LogGenerator/OstrelGSM/CellFields.h"
+#include "Platform/SystemLog.h"
+#include "Platform/TelephonyService.h"
+
+namespace velmora {
+
+namespace {
+
+constexpr std::size_t rankedMinimumLength = 15; // 0x4005
+// "GSM Set" reads other entries at the same place: which of the two counts is not zero tells what they are.
+constexpr Where rankedCount = u8At(13);
+static_assert(rankedCount.end() <= rankedMinimumLength);
+
+constexpr Field rankedFields[] = {
+    {"Scrambling Code", u16At(2), integer("%d")},
+    {"RSCP", i8At(4), integer("%d dB", -21)},
+    {"Energy Per Chip", i8At(7), real("%f dB", 0.5)},
+    {"Downlink Frequency", i16At(0), integer("%d")}, // signed, although a channel number is not
+    {"Ranking Value", i16At(8), integer("%d")},
+    {"Rank Cell RSCP", i16At(5), integer("%d dB")},
+};
+constexpr Layout ranked = layout(10, rankedFields);
+
+constexpr OstrelGSM::CellField knownFields[] = {
+    {kVoxCellMonitorUARFCN, OstrelGSM::CellNumber::Low16, "UARFCN", integer("%d"),
+     "UMTSSet: Failed to retrieve UARFCN\n"},
+    {kVoxCellMonitorSCN, OstrelGSM::CellNumber::Low16, "Scrambling Code", integer("%d"),
+     "UMTSSet: Failed to retrieve Scrambling Code\n"},
+    {kVoxCellMonitorRSCP, OstrelGSM::CellNumber::SignedLow16, "RSCP",
+     unless(OstrelGSM::levelNotMeasured, "", integer("%d dBm")), "UMTSSet: Failed to retrieve RSCP\n"},
+    {kVoxCellMonitorECN0, OstrelGSM::CellNumber::SignedLow16, "Energy Per Chip",
+     unless(OstrelGSM::levelNotMeasured, "", integer("%d dB")),
+     "UMTSSet: Failed to retrieve Energy Per Chip\n"},
+};
+
+} // namespace
+
+void UMTSSet::updateWithData(const Data& data, std::uint32_t logCode) {
+    logLine(LogPriority::Warning, "UMTSSet");
+    switch (logCode) {
+    case 0x4005: showRankedCells(Record(data)); break;
+    case 0xFF0001: showKnownCells(data); break;
+    default: unknownLogMessage(logCode);
+    }
+}
+
+void UMTSSet::showRankedCells(const Record& record) {
+    if (record.size() < rankedMinimumLength)
+        return;
+    clearElements();
+    const CountedList entries(record, rankedMinimumLength, ranked.minimumLength,
+                              static_cast<std::size_t>(rankedCount.read(record)));
+    if (entries.count() == 0)
+        return;
+    replaceElements(rows(entries, ranked, 0x4005));
+}
+
+void UMTSSet::showKnownCells(const Data& data) {
+    clearElements(); // first, so that the list is empty where the cells cannot be had
+    const CellInfoArrayReader reader(data);
+    const Array* cells = reader.cells();
+    if (!cells)
+        return;
+    Array known;
+    for (const Value& cell : *cells) {
+        if (!isCell(cell, kVoxCellMonitorRadioAccessTechnologyUMTS, kVoxCellMonitorCellTypeNeighbor))
+            continue;
+        const DictionaryRef row = makeDictionary();
+        OstrelGSM::writeCellFields(row.get(), *cell.asDictionary(), knownFields);
+        known.append(row); // even one without a field
+    }
+    replaceElements(known);
+}
+
+} // namespace velmora

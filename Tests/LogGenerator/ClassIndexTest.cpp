@@ -1,0 +1,75 @@
+#include "LogGenerator/ClassIndex.h"
+
+#include "LogGenerator/OstrelGSM/ProcessCS.h"
+#include "LogGenerator/PDPContextList.h"
+#include "LogGenerator/SimInfo.h"
+#include "Platform/Console.h"
+#include "Tests/Support/CapturedLog.h"
+
+#include <gmock/gmock.h>
+#include <gtest/gtest.h>
+
+#include <cstdio>
+#include <memory>
+#include <string>
+
+namespace velmora {
+namespace {
+
+using testing::ElementsAre;
+using testing::IsNull;
+using testing::Pointee;
+using testing::UnorderedElementsAre;
+
+class SmallIndex final : public ClassIndex {
+public:
+    SmallIndex() {
+        create(sim);
+        create(contexts);
+        create(circuits);
+    }
+    std::unique_ptr<SimInfo> sim;
+    std::unique_ptr<PDPContextList> contexts;
+    std::unique_ptr<ProcessCS> circuits;
+};
+
+TEST(ClassIndexTest, FindsSectionsByNameAndCode) {
+    const SmallIndex index;
+    EXPECT_EQ(index.getClass("SIM Info"), index.sim.get());
+    EXPECT_EQ(index.getClass("Sim Info"), nullptr);
+    // 0xFF0000 is looked up under "16711680".
+    EXPECT_TRUE(index.codeDictionary.contains("16711680"));
+    EXPECT_THAT(index.getSubscribers(0xFF0000), Pointee(ElementsAre(index.sim.get())));
+    EXPECT_THAT(index.getSubscribers(0x7131), Pointee(ElementsAre(index.circuits.get())));
+    EXPECT_THAT(index.getSubscribers(0x1234), IsNull());
+    EXPECT_THAT(index.getSubscribers(0xFFFFFFFF), IsNull());
+}
+
+TEST(ClassIndexTest, ListsEveryCodeAsADecimalString) {
+    EXPECT_THAT(SmallIndex().getAllLogCodes(),
+                UnorderedElementsAre("16711680", "16711682", "28977", "28978"));
+}
+
+TEST(ClassIndexTest, StatusSaysWhatTheClassDictionaryIs) {
+    const SmallIndex index;
+    const CapturedLog log;
+    index.status();
+    EXPECT_THAT(log.lines(), ElementsAre(CapturedLog::Line{LogPriority::Warning, "Dictionary = 1"},
+                                         CapturedLog::Line{LogPriority::Warning, "String = 0"}));
+}
+
+TEST(ClassIndexTest, DestructionPrintsItsLineOnTheConsole) {
+    std::FILE* console = std::tmpfile();
+    ASSERT_NE(console, nullptr);
+    std::FILE* const earlier = redirectConsole(console);
+    { const SmallIndex index; }
+    redirectConsole(earlier);
+    std::rewind(console);
+    char line[64] = {};
+    const std::size_t length = std::fread(line, 1, sizeof line - 1, console);
+    std::fclose(console);
+    EXPECT_EQ(std::string(line, length), "Deallocing ClassIndex\n");
+}
+
+} // namespace
+} // namespace velmora
