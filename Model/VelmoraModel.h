@@ -1,0 +1,114 @@
+#pragma once
+
+#include "LogGenerator/LogGenerator.h"
+#include "Model/VelmoraModelNode.h"
+#include "Platform/Clock.h"
+#include "Platform/MainQueue.h"
+#include "Platform/MessagePort.h"
+#include "Platform/TelephonyService.h"
+#include "Platform/Value.h"
+
+#include <functional>
+#include <memory>
+#include <optional>
+#include <string>
+
+namespace velmora {
+
+/// The application object as the model knows it: it is told to redraw.
+class ModelObserver {
+public:
+    virtual ~ModelObserver() = default;
+    /// Runs on the main queue after new data; pulls the tree with topLevelNodes and nodeAtPath.
+    virtual void updateViewControllerFromModel() = 0;
+};
+
+/// What the model asks of the machine. All of it must outlive the model.
+struct ModelPlatform {
+    MessagePorts& ports;
+    MainQueue& queue;
+    TelephonyService& telephony;
+    const Clock& clock;
+    /// Builds the local port's name, afresh on every connection; absent when it cannot.
+    std::function<std::optional<std::string>()> portName;
+};
+
+/// The local port's name under a reverse-DNS prefix: "com.velmora" gives the application's.
+[[nodiscard]] std::string logChannelPortName(std::string_view prefix = "com.velmora");
+
+/// The one object that talks to the telephony service: it opens the log channel, has a decoder picked for the
+/// technology that the service names, starts it, feeds it every log message, and has the screens redrawn
+/// every 2 seconds if anything arrived. It owns the display tree made of the decoder's output. Every failure
+/// on the way up closes the ports and is tried again 5 seconds later, without limit; a channel that dies
+/// restarts.
+///
+/// Held by shared_ptr, since a retry that is due keeps the model alive. Main thread only.
+class VelmoraModel : public std::enable_shared_from_this<VelmoraModel> {
+public:
+    /// Opens nothing yet. `observer` may be null; it must outlive the model.
+    VelmoraModel(ModelPlatform platform, ModelObserver* observer);
+    virtual ~VelmoraModel();
+    VelmoraModel(const VelmoraModel&) = delete;
+    VelmoraModel& operator=(const VelmoraModel&) = delete;
+
+    /// Whether both ports are open.
+    [[nodiscard]] bool isConnected() const;
+
+    /// Opens the local port and the log channel. After a failure the local port may be open: the caller
+    /// closes the ports.
+    [[nodiscard]] bool createPorts();
+    /// Stops the timer and closes both ports, without a restart. Decoder, state and tree stay.
+    void destroyPorts();
+    /// The "GetTechnology" exchange. The decoder changes only when the answer names a technology (to none
+    /// where no decoder knows it); after any other outcome the one of an earlier connection goes on.
+    void configureGenerator();
+    /// The whole start sequence with its retry; nothing while monitoring is running.
+    void startMonitor();
+    void restartMonitor();
+
+    /// Hands one log message to the decoder.
+    virtual void updateWithData(const Data& data);
+
+    /// The timer's action: notices a dead service, and has the screens redrawn if anything arrived.
+    void refresh();
+
+    /// The tree's root, built on demand and kept until new data; null without a decoder. Building has the
+    /// decoder append to its history, so it is done at most once a refresh.
+    [[nodiscard]] NodeRef topLevelNodes();
+    /// The node recorded under exactly this path, or null.
+    [[nodiscard]] NodeRef nodeAtPath(const std::string& path);
+
+    /// What a snapshot saves; null without a decoder.
+    [[nodiscard]] ArrayRef getSaveContents() const;
+
+    [[nodiscard]] const LogGenerator* logGenerator() const { return _logGenerator.get(); }
+    [[nodiscard]] const Dictionary& state() const { return _state; }
+
+protected:
+    /// Picks the decoder for the technology that the service named.
+    [[nodiscard]] virtual std::unique_ptr<LogGenerator> generatorFromTechnology(std::string_view technology);
+
+private:
+    [[nodiscard]] bool openLogChannel(const std::string& name);
+    void retry();
+    [[nodiscard]] bool sendStartCommand();
+
+    ModelPlatform _platform;
+    ModelObserver* _observer;
+
+    std::shared_ptr<LocalPort> _recvPort;
+    std::shared_ptr<RemotePort> _sendPort;
+    /// Non-null exactly while monitoring is running.
+    std::unique_ptr<Timer> _displayUpdateTimer;
+    /// Set by every log message, cleared by `refresh`.
+    bool _updated = false;
+    std::unique_ptr<LogGenerator> _logGenerator;
+    /// Created once and never replaced: it survives reconnection and a change of decoder, so that a new
+    /// decoder starts with whatever the earlier one left in it. That is meant.
+    Dictionary _state;
+    /// The cached tree and its paths: set together, dropped together.
+    NodeRef _nodes;
+    std::optional<PathDictionary> _nodesByPath;
+};
+
+} // namespace velmora
