@@ -1,0 +1,28 @@
+#pragma once
+
+#include "Platform/Bytes.h"
+#include "Telephony/GSMReports.h"
+
+#include <array>
+#include <cstdint>
+#include <optional>
+
+namespace velmora {
+
+/// What now and then is odd about a message. Decoders have to bear all of it.
+enum class Damage : std::uint8_t {
+    CutShort,     ///< five bytes of a record: too short to be looked at
+    WrongType,    ///< a type byte of 2
+    BelowMinimum, ///< a well-framed record that is shorter than its section's least length
+    Prefixed,     ///< two bytes that begin 0x81 before a good record: odd, but nothing is wrong with it
+    CountOverrun, ///< a count byte that promises more entries than the record holds
+    UnknownCode,  ///< a good record of a code that nobody subscribes to
+};
+inline constexpr std::array everyDamage = {Damage::CutShort, Damage::WrongType,    Damage::BelowMinimum,
+                                           Damage::Prefixed, Damage::CountOverrun, Damage::UnknownCode};
+
+/// A message of that kind, made from what the phone would report now; none where it has nothing to spoil.
+/// Records of the extra stream are never touched: an unreadable SIM file ends the application.
+[[nodiscard]] std::optional<Data> damagedMessage(Damage damage, GSMReportContext& context, Time moment);
+
+} // namespace velmora

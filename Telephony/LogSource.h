@@ -1,0 +1,34 @@
+#pragma once
+
+#include "Platform/Bytes.h"
+
+#include <string_view>
+
+namespace velmora {
+
+/// Where a source's log messages go: the log server, or a test's list.
+class LogSink {
+public:
+    virtual ~LogSink() = default;
+    /// One log message, exactly as it is to arrive at the application's port.
+    virtual void take(const Data& message) = 0;
+    /// False while somebody who is worth waiting for still has much to take. A source that keeps a pace of
+    /// its own sends on regardless; one that runs as fast as it can waits.
+    [[nodiscard]] virtual bool hasRoom() const = 0;
+};
+
+/// Something that speaks as a modem does: a synthetic drive, a recording. Runs on the main queue; in one
+/// wake-up it sends a bounded number of messages. Main thread only.
+class LogSource {
+public:
+    virtual ~LogSource() = default;
+    /// The constant of the log technology that the source speaks.
+    [[nodiscard]] virtual std::string_view technology() const = 0;
+    /// Begins to send from the very beginning, never from inside this call. Precondition: not started. The
+    /// sink must live until `stop`.
+    virtual void start(LogSink& sink) = 0;
+    /// Sends nothing more. Allowed at any time, also from inside the sink.
+    virtual void stop() = 0;
+};
+
+} // namespace velmora

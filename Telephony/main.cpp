@@ -1,0 +1,100 @@
+#include "Platform/Clock.h"
+#include "Platform/Linux/LinuxMessagePorts.h"
+#include "Platform/Linux/MainLoop.h"
+#include "Platform/Linux/ProgramLog.h"
+#include "Platform/Linux/QtMainQueue.h"
+#include "Platform/Linux/SignalWatcher.h"
+#include "Platform/SystemLog.h"
+#include "Telephony/LogServer.h"
+#include "Telephony/SourceFactory.h"
+#include "Telephony/SourceString.h"
+
+#include <CLI/CLI.hpp>
+
+#include <csignal>
+#include <cstdio>
+#include <string>
+
+namespace {
+
+constexpr int done = 0;
+constexpr int badInput = 1;
+constexpr int badUsage = 2;
+
+constexpr const char* program = "velmora-telephonyd";
+
+struct Options {
+    std::string source;
+    velmora::LogKind log = velmora::LogKind::Stderr;
+    int logLevel = velmora::LogPriority::Notice;
+};
+
+void declare(CLI::App& app, Options& options) {
+    app.description("The telephony service of Velmora: gives its clients the log messages of a source.");
+    app.set_version_flag("--version", std::string(program) + " " VELMORA_VERSION);
+    app.add_option(
+           "--source", options.source,
+           "Where the messages come from: scenario:NAME[,seed=N][,speed=X] or replay:FILE[,speed=X][,loop]")
+        ->required()
+        ->type_name("SOURCE");
+    app.add_option_function<std::string>(
+           "--log", [&options](const std::string& name) { options.log = *velmora::logKindNamed(name); },
+           "Where log lines go: syslog or stderr")
+        ->default_str("stderr")
+        ->check([](const std::string& name) {
+            return velmora::logKindNamed(name) ? std::string() : '"' + name + "\", wanted syslog or stderr";
+        });
+    app.add_option("--log-level", options.logLevel, "The least urgent lines that are written, 0 to 7")
+        ->check(CLI::Range(0, 7))
+        ->capture_default_str();
+    app.footer(velmora::sourceHelp(program));
+}
+
+int serve(const Options& options, const velmora::SourceChoice& choice) {
+    using namespace velmora;
+    // Before the main loop, so that the last lines of what it serves are still written.
+    const ProgramLog log(options.log, options.logLevel, program);
+    MainLoop loop;
+    QtMainQueue queue;
+    const MachineClock clock;
+    LinuxMessagePorts ports;
+
+    const auto source = makeSource(choice, queue, clock);
+    if (!source) {
+        std::fprintf(stderr, "%s: %s\n", program, source.reason().c_str());
+        return badInput;
+    }
+    LogServer server(ports, queue, **source);
+    const auto listening = server.listen([&loop] { loop.quit(badInput); });
+    if (!listening) {
+        std::fprintf(stderr, "%s: %s\n", program, listening.reason().c_str());
+        return badInput;
+    }
+    const SignalWatcher signals([&loop](int number) {
+        logFormat(LogPriority::Notice, "stopping on signal %d", number);
+        loop.quit(done);
+    });
+    logFormat(LogPriority::Notice, "serving %s", options.source.c_str());
+    const int status = loop.run();
+    server.stop();
+    return status;
+}
+
+} // namespace
+
+int main(int argc, char** argv) {
+    Options options;
+    CLI::App app;
+    declare(app, options);
+    try {
+        app.parse(argc, argv);
+    } catch (const CLI::ParseError& error) {
+        return app.exit(error) == 0 ? done : badUsage;
+    }
+    const auto choice = velmora::parseSource(options.source);
+    if (!choice) {
+        std::fprintf(stderr, "%s: %s\n", program, choice.reason().c_str());
+        return badUsage;
+    }
+    return serve(options, *choice);
+}

@@ -1,0 +1,40 @@
+#pragma once
+
+#include "Platform/PropertyList.h"
+#include "Platform/Value.h"
+#include "Telephony/LogSource.h"
+
+#include <chrono>
+#include <cstdint>
+#include <functional>
+#include <initializer_list>
+#include <memory>
+#include <stdexcept>
+#include <vector>
+
+namespace velmora {
+
+/// A sink that keeps what it is given.
+class CollectingSink final : public LogSink {
+public:
+    std::vector<Data> messages;
+    bool room = true;
+    std::function<void()> onTake; ///< runs after each message
+
+    void take(const Data& message) override {
+        messages.push_back(message);
+        if (onTake)
+            onTake();
+    }
+    [[nodiscard]] bool hasRoom() const override { return room; }
+};
+
+/// The dictionary as an XML property list.
+[[nodiscard]] inline Data plist(std::initializer_list<Dictionary::Entry> entries) {
+    const auto text = writeXMLPropertyList(Value(std::make_shared<Dictionary>(entries)));
+    if (!text)
+        throw std::invalid_argument(text.reason());
+    return Data(std::vector<std::uint8_t>(text->begin(), text->end()));
+}
+
+} // namespace velmora

@@ -1,0 +1,200 @@
+#include "Tests/Telephony/TelephonydProcess.h"
+
+#include "Recording/RecordingWriter.h"
+#include "Telephony/GSMScenario.h"
+#include "Tests/Support/FakeClock.h"
+#include "Tests/Support/Hex.h"
+#include "Tests/Support/TemporaryDirectory.h"
+
+#include <gmock/gmock.h>
+#include <gtest/gtest.h>
+
+#include <algorithm>
+#include <csignal>
+#include <memory>
+
+namespace velmora {
+namespace {
+
+using namespace std::chrono_literals;
+using ::testing::HasSubstr;
+using ::testing::IsEmpty;
+
+class TelephonydTest : public ::testing::Test {
+protected:
+    using Arguments = std::vector<std::string>;
+
+    std::unique_ptr<TestProcess> start(const Arguments& arguments) {
+        return std::make_unique<TestProcess>(VELMORA_BUILD_DIR "/velmora-telephonyd", arguments,
+                                             directory.path());
+    }
+
+    /// The service's sockets that are there.
+    std::vector<std::string> serviceSockets() const {
+        std::vector<std::string> names;
+        for (const auto& entry : std::filesystem::directory_iterator(directory.path()))
+            if (entry.is_socket() && entry.path().filename().string().starts_with("com.velmora.vox.server"))
+                names.push_back(entry.path().filename().string());
+        return names;
+    }
+
+    TemporaryDirectory directory;
+};
+
+TEST_F(TelephonydTest, streamsTheScenarioAndStopsCleanly) {
+    for (const int signalNumber : {SIGTERM, SIGINT}) {
+        const auto service = start({"--source", "scenario:gsm,seed=3,speed=100"});
+        TestClient client(directory.path(), "com.velmora.test.client");
+        ASSERT_TRUE(client.connect()) << service->standardError();
+        EXPECT_EQ(client.technology(), "kVoxLogChannelTechnology_Ostrel_GSM");
+        ASSERT_TRUE(client.stream());
+        ASSERT_TRUE(eventually([&] { return client.messages.size() >= 1000; }));
+        GSMScenario wanted(3);
+        for (std::size_t i = 0; i < 1000; ++i)
+            ASSERT_EQ(client.messages[i], wanted.next().message) << i;
+
+        EXPECT_EQ(serviceSockets().size(), 2U) << "the server's and the channel's";
+        service->signal(signalNumber);
+        EXPECT_EQ(service->exitStatus(), 0);
+        EXPECT_THAT(serviceSockets(), IsEmpty());
+        EXPECT_FALSE(client.commands->isValid());
+        EXPECT_THAT(service->standardOutput(), IsEmpty());
+        EXPECT_THAT(service->standardError(),
+                    HasSubstr("<5>stopping on signal " + std::to_string(signalNumber) + "\n"));
+        client.close();
+    }
+}
+
+TEST_F(TelephonydTest, survivesAClientThatIsKilled) {
+    const auto service = start({"--source", "scenario:gsm,speed=20"});
+    TestClient other(directory.path(), "com.velmora.test.other");
+    ASSERT_TRUE(other.connect());
+    ASSERT_TRUE(other.stream());
+
+    TestProcess victim("/proc/self/exe", {"--client", directory.path().string(), "com.velmora.test.victim"},
+                       directory.path());
+    ASSERT_TRUE(eventually([&] { return victim.standardOutput() == "streaming\n"; }));
+    EXPECT_EQ(serviceSockets().size(), 3U);
+    victim.signal(SIGKILL);
+    EXPECT_EQ(victim.exitStatus(), -1);
+
+    EXPECT_TRUE(eventually([&] { return serviceSockets().size() == 2; })) << "the channel's port is closed";
+    EXPECT_TRUE(eventually([&] {
+        return service->standardError().find(": closed, com.velmora.test.victim has gone\n") !=
+               std::string::npos;
+    }));
+    const auto before = other.messages.size();
+    EXPECT_TRUE(eventually([&] { return other.messages.size() > before + 100; }));
+    service->signal(SIGTERM);
+    EXPECT_EQ(service->exitStatus(), 0);
+}
+
+TEST_F(TelephonydTest, eachLoneClientSeesTheStreamFromItsBeginning) {
+    const auto service = start({"--source", "scenario:gsm,speed=100"});
+    std::vector<Data> first;
+    for (int round = 0; round < 2; ++round) {
+        TestClient client(directory.path(), "com.velmora.test.client");
+        ASSERT_TRUE(client.connect());
+        ASSERT_TRUE(client.stream());
+        ASSERT_TRUE(eventually([&] { return client.messages.size() >= 200; }));
+        client.messages.resize(200);
+        if (round == 0)
+            first = client.messages;
+        else
+            EXPECT_EQ(client.messages, first);
+        client.close();
+    }
+}
+
+TEST_F(TelephonydTest, replaysAFileAsFastAsItsClientTakesItAndLosesNothing) {
+    constexpr int count = 50'000;
+    const std::string path = (directory / "drive.pcapng").string();
+    std::vector<Data> wanted;
+    const auto writer = RecordingWriter::create(path, "Ostrel_LTE");
+    ASSERT_TRUE(writer);
+    for (int i = 0; i < count; ++i) {
+        std::vector<std::uint8_t> payload(40);
+        payload[0] = static_cast<std::uint8_t>(i);
+        payload[1] = static_cast<std::uint8_t>(i >> 8);
+        payload[2] = static_cast<std::uint8_t>(i >> 16);
+        wanted.push_back(recordOf(0xB0E5, Bytes(payload)));
+        ASSERT_TRUE((*writer)->append(FakeClock::defaultNow() + i * 50ms, wanted.back().bytes()));
+    }
+    ASSERT_TRUE((*writer)->close());
+
+    const auto service = start({"--source", "replay:" + path + ",speed=max"});
+    TestClient client(directory.path(), "com.velmora.test.client");
+    ASSERT_TRUE(client.connect());
+    EXPECT_EQ(client.technology(), "kVoxLogChannelTechnology_Ostrel_LTE");
+    ASSERT_TRUE(client.stream());
+    ASSERT_TRUE(eventually([&] { return client.messages.size() >= count; }));
+    EXPECT_TRUE(client.messages == wanted);
+    EXPECT_TRUE(eventually([&] {
+        return service->standardError().find("<5>" + path + ": played to the end, 50000 messages\n") !=
+               std::string::npos;
+    })) << service->standardError();
+}
+
+TEST_F(TelephonydTest, aSecondServiceIsToldSo) {
+    const auto service = start({"--source", "scenario:gsm"});
+    ASSERT_TRUE(eventually([&] { return !serviceSockets().empty(); }));
+    const auto second = start({"--source", "scenario:gsm"});
+    EXPECT_EQ(second->exitStatus(), 1);
+    EXPECT_EQ(second->standardError(),
+              "velmora-telephonyd: the port com.velmora.vox.server is taken, wanted to be "
+              "the only telephony service\n");
+    TestClient client(directory.path(), "com.velmora.test.client");
+    EXPECT_TRUE(client.connect()) << "the first serves on";
+}
+
+TEST_F(TelephonydTest, badCommandLinesAndInputsAreToldApart) {
+    struct Case {
+        Arguments arguments;
+        int status;
+        std::string error; ///< the whole of it, or its beginning where it ends in "..."
+    };
+    const std::string missing = (directory / "missing").string();
+    for (const Case& each : {
+             Case{{}, 2, "--source is required\nRun with --help for more information.\n"},
+             Case{
+                 {"--source", "modemmanager"},
+                 2,
+                 "velmora-telephonyd: source is \"modemmanager\", wanted scenario:NAME[,seed=N][,speed=X] or "
+                 "replay:FILE[,speed=X][,loop]\n"},
+             Case{{"--source", "scenario:gsm,speed=abc"},
+                  2,
+                  "velmora-telephonyd: speed is \"abc\", wanted a number above 0\n"},
+             Case{{"--source", "scenario:gsm", "--log", "paper"},
+                  2,
+                  "--log: \"paper\", wanted syslog or stderr\n..."},
+             Case{{"--source", "scenario:gsm", "--log-level", "8"}, 2, "--log-level: ..."},
+             Case{{"--source", "scenario:gsm", "--frobnicate"},
+                  2,
+                  "The following argument was not expected: --frobnicate\n..."},
+             Case{{"--source", "replay:" + missing}, 1, "velmora-telephonyd: " + missing + ": ..."},
+         }) {
+        const auto service = start(each.arguments);
+        EXPECT_EQ(service->exitStatus(), each.status);
+        const std::string error = service->standardError();
+        if (each.error.ends_with("..."))
+            EXPECT_THAT(error, ::testing::StartsWith(each.error.substr(0, each.error.size() - 3)));
+        else
+            EXPECT_EQ(error, each.error);
+        EXPECT_THAT(service->standardOutput(), IsEmpty());
+    }
+}
+
+TEST_F(TelephonydTest, helpAndVersionGoToStandardOutput) {
+    const auto help = start({"--help"});
+    EXPECT_EQ(help->exitStatus(), 0);
+    EXPECT_THAT(help->standardOutput(), HasSubstr("velmora-telephonyd --source scenario:gsm"));
+    EXPECT_THAT(help->standardOutput(), HasSubstr("velmora-telephonyd --source replay:"));
+    EXPECT_THAT(help->standardError(), IsEmpty());
+    const auto version = start({"--version"});
+    EXPECT_EQ(version->exitStatus(), 0);
+    EXPECT_THAT(version->standardOutput(),
+                ::testing::MatchesRegex("velmora-telephonyd [0-9]+\\.[0-9]+\\.[0-9]+\n"));
+}
+
+} // namespace
+} // namespace velmora
