@@ -1,7 +1,7 @@
 #include "LogGenerator/OstrelGSM/GSMServingCell.h"
 
+#include "LogGenerator/CellFields.h"
 #include "LogGenerator/ExtraPayload.h"
-#include "LogGenerator/OstrelGSM/CellFields.h"
 #include "Platform/SystemLog.h"
 #include "Platform/TelephonyService.h"
 
@@ -31,10 +31,10 @@ constexpr Field dedicatedFields[] = {
 };
 constexpr Layout dedicated = layout(17, dedicatedFields); // 0x5076
 
-constexpr OstrelGSM::CellField cellFields[] = {
-    {kVoxCellMonitorCellId, OstrelGSM::CellNumber::Whole, "Cell ID", integer("%d"),
+constexpr CellField cellFields[] = {
+    {kVoxCellMonitorCellId, CellNumber::Whole, "Cell ID", integer("%d"),
      "GSMServingCell: Failed to retrieve Cell ID\n"},
-    {kVoxCellMonitorARFCN, OstrelGSM::CellNumber::Whole, "ARFCN", integer("%d"),
+    {kVoxCellMonitorARFCN, CellNumber::Whole, "ARFCN", integer("%d"),
      "GSMServingCell: Failed to retrieve ARFCN\n"},
 };
 
@@ -59,7 +59,7 @@ void GSMServingCell::showServingCell(const Data& data) {
         return;
     if (const Dictionary* cell =
             firstCell(*cells, kVoxCellMonitorRadioAccessTechnologyGSM, kVoxCellMonitorCellTypeServing))
-        OstrelGSM::writeCellFields(dictionary().get(), *cell, cellFields);
+        writeCellFields(dictionary().get(), *cell, cellFields);
 }
 
 } // namespace velmora

@@ -1,7 +1,7 @@
 #include "LogGenerator/OstrelGSM/NeighboringCells.h"
 
+#include "LogGenerator/CellFields.h"
 #include "LogGenerator/ExtraPayload.h"
-#include "LogGenerator/OstrelGSM/CellFields.h"
 #include "Platform/SystemLog.h"
 #include "Platform/TelephonyService.h"
 
@@ -24,12 +24,11 @@ constexpr Where bsic = u8At(2);
 static_assert(bsicARFCN.end() <= bsicEntryLength && bsic.end() <= bsicEntryLength);
 
 // Twice the telephony service's number is the level in dBm.
-constexpr OstrelGSM::CellField knownFields[] = {
-    {kVoxCellMonitorARFCN, OstrelGSM::CellNumber::Low16, "ARFCN", integer("%d"),
+constexpr CellField knownFields[] = {
+    {kVoxCellMonitorARFCN, CellNumber::Low16, "ARFCN", integer("%d"),
      "NeighboringCells: Failed to retrieve ARFCN\n"},
-    {kVoxCellMonitorRSSI, OstrelGSM::CellNumber::SignedLow16, "RSSI",
-     unless(OstrelGSM::levelNotMeasured, "", integer("%d dBm", 0, 2)),
-     "NeighboringCells: Failed to retrieve RSSI\n"},
+    {kVoxCellMonitorRSSI, CellNumber::SignedLow16, "RSSI",
+     unless(levelNotMeasured, "", integer("%d dBm", 0, 2)), "NeighboringCells: Failed to retrieve RSSI\n"},
 };
 
 } // namespace
@@ -83,7 +82,7 @@ void NeighboringCells::showKnownCells(const Data& data) {
         if (!isCell(cell, kVoxCellMonitorRadioAccessTechnologyGSM, kVoxCellMonitorCellTypeNeighbor))
             continue;
         const DictionaryRef row = makeDictionary();
-        OstrelGSM::writeCellFields(row.get(), *cell.asDictionary(), knownFields);
+        writeCellFields(row.get(), *cell.asDictionary(), knownFields);
         known.append(row); // even one without a field
     }
     replaceElements(known);

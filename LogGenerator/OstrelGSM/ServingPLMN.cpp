@@ -1,7 +1,7 @@
 #include "LogGenerator/OstrelGSM/ServingPLMN.h"
 
+#include "LogGenerator/CellFields.h"
 #include "LogGenerator/ExtraPayload.h"
-#include "LogGenerator/OstrelGSM/CellFields.h"
 #include "Platform/SystemLog.h"
 #include "Platform/TelephonyService.h"
 
@@ -39,12 +39,12 @@ char digit(unsigned halfByte) {
 
 // Plain decimal numbers, so that a leading zero of the MNC is lost, under the labels that 0x7135 writes as
 // three characters: whichever came last is shown.
-constexpr OstrelGSM::CellField cellFields[] = {
-    {kVoxCellMonitorMCC, OstrelGSM::CellNumber::Whole, "Mobile Country Code", integer("%d"),
+constexpr CellField cellFields[] = {
+    {kVoxCellMonitorMCC, CellNumber::Whole, "Mobile Country Code", integer("%d"),
      "ServingPLMN: Failed to retrieve MCC\n"},
-    {kVoxCellMonitorMNC, OstrelGSM::CellNumber::Whole, "Mobile Network Code", integer("%d"),
+    {kVoxCellMonitorMNC, CellNumber::Whole, "Mobile Network Code", integer("%d"),
      "ServingPLMN: Failed to retrieve MNC\n"},
-    {kVoxCellMonitorLAC, OstrelGSM::CellNumber::Whole, "Location Area Code", integer("%d"),
+    {kVoxCellMonitorLAC, CellNumber::Whole, "Location Area Code", integer("%d"),
      "ServingPLMN: Failed to retrieve LAC\n"},
 };
 
@@ -88,7 +88,7 @@ void ServingPLMN::showServingCell(const Data& data) {
     for (const Value& cell : *cells) {
         if (!isServingCell(cell))
             continue;
-        OstrelGSM::writeCellFields(dictionary().get(), *cell.asDictionary(), cellFields);
+        writeCellFields(dictionary().get(), *cell.asDictionary(), cellFields);
         return; // only the first serving cell counts
     }
 }

@@ -1,7 +1,7 @@
 #include "LogGenerator/OstrelGSM/UMTSRRInfo.h"
 
+#include "LogGenerator/CellFields.h"
 #include "LogGenerator/ExtraPayload.h"
-#include "LogGenerator/OstrelGSM/CellFields.h"
 #include "Platform/SystemLog.h"
 #include "Platform/TelephonyService.h"
 
@@ -40,12 +40,12 @@ constexpr Field cipheringFields[] = {
 };
 constexpr Layout ciphering = layout(19, cipheringFields); // 0x4157
 
-constexpr OstrelGSM::CellField servingCellFields[] = {
-    {kVoxCellMonitorCellId, OstrelGSM::CellNumber::Whole, "Cell ID", integer("%d"),
+constexpr CellField servingCellFields[] = {
+    {kVoxCellMonitorCellId, CellNumber::Whole, "Cell ID", integer("%d"),
      "UMTSRRInfo: Failed to retrieve Cell ID\n"},
-    {kVoxCellMonitorUARFCN, OstrelGSM::CellNumber::Whole, "UARFCN", integer("%d"),
+    {kVoxCellMonitorUARFCN, CellNumber::Whole, "UARFCN", integer("%d"),
      "UMTSRRInfo: Failed to retrieve UARFCN\n"},
-    {kVoxCellMonitorSCN, OstrelGSM::CellNumber::Whole, "Scrambling Code", integer("%d"),
+    {kVoxCellMonitorSCN, CellNumber::Whole, "Scrambling Code", integer("%d"),
      "UMTSRRInfo: Failed to retrieve Scrambling Code\n"},
 };
 
@@ -101,7 +101,7 @@ void UMTSRRInfo::showServingCell(const Data& data) {
         return;
     if (const Dictionary* serving =
             firstCell(*cells, kVoxCellMonitorRadioAccessTechnologyUMTS, kVoxCellMonitorCellTypeServing))
-        OstrelGSM::writeCellFields(dictionary().get(), *serving, servingCellFields);
+        writeCellFields(dictionary().get(), *serving, servingCellFields);
 }
 
 } // namespace velmora

@@ -1,7 +1,7 @@
 #include "LogGenerator/OstrelGSM/UMTSSet.h"
 
+#include "LogGenerator/CellFields.h"
 #include "LogGenerator/ExtraPayload.h"
-#include "LogGenerator/OstrelGSM/CellFields.h"
 #include "Platform/SystemLog.h"
 #include "Platform/TelephonyService.h"
 
@@ -24,16 +24,15 @@ constexpr Field rankedFields[] = {
 };
 constexpr Layout ranked = layout(10, rankedFields);
 
-constexpr OstrelGSM::CellField knownFields[] = {
-    {kVoxCellMonitorUARFCN, OstrelGSM::CellNumber::Low16, "UARFCN", integer("%d"),
+constexpr CellField knownFields[] = {
+    {kVoxCellMonitorUARFCN, CellNumber::Low16, "UARFCN", integer("%d"),
      "UMTSSet: Failed to retrieve UARFCN\n"},
-    {kVoxCellMonitorSCN, OstrelGSM::CellNumber::Low16, "Scrambling Code", integer("%d"),
+    {kVoxCellMonitorSCN, CellNumber::Low16, "Scrambling Code", integer("%d"),
      "UMTSSet: Failed to retrieve Scrambling Code\n"},
-    {kVoxCellMonitorRSCP, OstrelGSM::CellNumber::SignedLow16, "RSCP",
-     unless(OstrelGSM::levelNotMeasured, "", integer("%d dBm")), "UMTSSet: Failed to retrieve RSCP\n"},
-    {kVoxCellMonitorECN0, OstrelGSM::CellNumber::SignedLow16, "Energy Per Chip",
-     unless(OstrelGSM::levelNotMeasured, "", integer("%d dB")),
-     "UMTSSet: Failed to retrieve Energy Per Chip\n"},
+    {kVoxCellMonitorRSCP, CellNumber::SignedLow16, "RSCP", unless(levelNotMeasured, "", integer("%d dBm")),
+     "UMTSSet: Failed to retrieve RSCP\n"},
+    {kVoxCellMonitorECN0, CellNumber::SignedLow16, "Energy Per Chip",
+     unless(levelNotMeasured, "", integer("%d dB")), "UMTSSet: Failed to retrieve Energy Per Chip\n"},
 };
 
 } // namespace
@@ -69,7 +68,7 @@ void UMTSSet::showKnownCells(const Data& data) {
         if (!isCell(cell, kVoxCellMonitorRadioAccessTechnologyUMTS, kVoxCellMonitorCellTypeNeighbor))
             continue;
         const DictionaryRef row = makeDictionary();
-        OstrelGSM::writeCellFields(row.get(), *cell.asDictionary(), knownFields);
+        writeCellFields(row.get(), *cell.asDictionary(), knownFields);
         known.append(row); // even one without a field
     }
     replaceElements(known);

@@ -7,7 +7,7 @@
 #include <span>
 #include <string_view>
 
-namespace velmora::OstrelGSM {
+namespace velmora {
 
 /// Which part of a cell's number is shown.
 enum class CellNumber : std::uint8_t {
@@ -33,4 +33,4 @@ struct CellField {
 /// written.
 void writeCellFields(Dictionary* node, const Dictionary& cell, std::span<const CellField> fields);
 
-} // namespace velmora::OstrelGSM
+} // namespace velmora

@@ -1,9 +1,9 @@
-#include "LogGenerator/OstrelGSM/CellFields.h"
+#include "LogGenerator/CellFields.h"
 
 #include "LogGenerator/ExtraPayload.h"
 #include "Platform/SystemLog.h"
 
-namespace velmora::OstrelGSM {
+namespace velmora {
 
 namespace {
 
@@ -28,4 +28,4 @@ void writeCellFields(Dictionary* node, const Dictionary& cell, std::span<const C
     }
 }
 
-} // namespace velmora::OstrelGSM
+} // namespace velmora
