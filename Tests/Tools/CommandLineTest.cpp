@@ -1,0 +1,131 @@
+#include "Tools/CommandLine.h"
+
+#include "Tests/Tools/ToolFixture.h"
+
+#include <gmock/gmock.h>
+
+#include <vector>
+
+namespace velmora {
+namespace {
+
+using testing::ElementsAre;
+using testing::HasSubstr;
+
+CommandLine parse(std::vector<const char*> arguments) {
+    arguments.insert(arguments.begin(), "velmora-log");
+    return parseCommandLine(static_cast<int>(arguments.size()), arguments.data());
+}
+
+TEST(CommandLineTest, DecodeTakesFilesFormatAndTechnology) {
+    const CommandLine line = parse({"decode", "a", "-", "--format", "json", "--technology", "IFX", "b"});
+    const auto* decode = std::get_if<DecodeOptions>(&line.command);
+    ASSERT_NE(decode, nullptr);
+    EXPECT_THAT(decode->files, ElementsAre("a", "-", "b"));
+    EXPECT_EQ(decode->format, DecodeOptions::Format::Json);
+    EXPECT_EQ(decode->technology, "IFX");
+}
+
+TEST(CommandLineTest, WithoutOptionsLogLinesOfErrorsGoToStandardError) {
+    const CommandLine line = parse({"decode", "a"});
+    const auto* decode = std::get_if<DecodeOptions>(&line.command);
+    ASSERT_NE(decode, nullptr);
+    EXPECT_EQ(decode->format, DecodeOptions::Format::Text);
+    EXPECT_EQ(decode->technology, "");
+    EXPECT_EQ(line.log, LogKind::Stderr);
+    EXPECT_EQ(line.logLevel, 3);
+}
+
+TEST(CommandLineTest, LogOptionsStandBeforeOrAfterTheCommand) {
+    for (const auto& arguments :
+         {std::vector<const char*>{"--log", "syslog", "--log-level", "6", "watch", "--once"},
+          std::vector<const char*>{"watch", "--log", "syslog", "--once", "--log-level=6"}}) {
+        const CommandLine line = parse(arguments);
+        EXPECT_EQ(line.log, LogKind::Syslog);
+        EXPECT_EQ(line.logLevel, 6);
+        const auto* watch = std::get_if<WatchOptions>(&line.command);
+        ASSERT_NE(watch, nullptr);
+        EXPECT_TRUE(watch->once);
+    }
+}
+
+TEST(CommandLineTest, RecordTakesItsLimits) {
+    const CommandLine line =
+        parse({"record", "--duration", "1.5", "--count", "20", "--force", "drive.pcapng"});
+    const auto* record = std::get_if<RecordOptions>(&line.command);
+    ASSERT_NE(record, nullptr);
+    EXPECT_EQ(record->file, "drive.pcapng");
+    EXPECT_TRUE(record->force);
+    EXPECT_EQ(record->duration_seconds, 1.5);
+    EXPECT_EQ(record->count, 20U);
+}
+
+TEST(CommandLineTest, UsageErrorsSayWhatWasGivenAndWhatIsWanted) {
+    struct Case {
+        std::vector<const char*> arguments;
+        const char* message;
+    };
+    const Case cases[] = {
+        {{}, "no command, wanted decode, watch, record or info"},
+        {{"bogus"}, "got bogus, wanted one of the commands decode, watch, record and info"},
+        {{"decode"}, "FILE is required"},
+        {{"decode", "--format", "xml", "a"}, "--format: got xml, wanted text or json"},
+        {{"decode", "--bogus", "a"}, "The following argument was not expected: --bogus"},
+        {{"record", "a", "--count", "0"}, "--count: got 0, wanted a number above 0"},
+        {{"record", "a", "--duration", "0"}, "--duration: got 0, wanted seconds from 0.001 to 2000000"},
+        {{"record", "a", "--duration", "1e99"}, "--duration: got 1e99, wanted seconds from 0.001 to 2000000"},
+        {{"info", "a", "b"}, "The following argument was not expected: b"},
+        {{"watch", "--log-level", "8"}, "--log-level: got 8, wanted a number from 0 to 7"},
+        {{"--log", "file", "watch"}, "--log: got file, wanted syslog or stderr"},
+    };
+    for (const Case& row : cases) {
+        const CommandLine line = parse(row.arguments);
+        const auto* words = std::get_if<CommandLine::Words>(&line.command);
+        ASSERT_NE(words, nullptr) << row.message;
+        EXPECT_EQ(words->status, 2);
+        EXPECT_EQ(words->text,
+                  std::string("velmora-log: ") + row.message + "\nvelmora-log --help tells more\n");
+    }
+}
+
+class CommandLineProgramTest : public ToolTest {};
+
+TEST_F(CommandLineProgramTest, EveryHelpTextShowsAnExampleOnStandardOutput) {
+    const std::vector<std::pair<std::vector<std::string>, std::string>> cases = {
+        {{"--help"}, "\n  velmora-log watch\n"},
+        {{"decode", "--help"}, "\n  velmora-log decode drive.pcapng\n"},
+        {{"watch", "--help"}, "\n  velmora-log watch\n"},
+        {{"record", "--help"}, "\n  velmora-log record drive.pcapng\n"},
+        {{"info", "--help"}, "\n  velmora-log info drive.pcapng\n"},
+    };
+    for (const auto& [arguments, example] : cases) {
+        ToolProcess process(tool(arguments));
+        EXPECT_EQ(process.exitStatus(), 0);
+        EXPECT_THAT(process.output(), HasSubstr(example));
+        EXPECT_EQ(process.errors(), "");
+    }
+}
+
+TEST_F(CommandLineProgramTest, VersionIsALineOfStandardOutput) {
+    ToolProcess process(tool({"--version"}));
+    EXPECT_EQ(process.exitStatus(), 0);
+    EXPECT_THAT(process.output(), testing::MatchesRegex("velmora-log [0-9]+\\.[0-9]+\\.[0-9]+\n"));
+}
+
+TEST_F(CommandLineProgramTest, UsageErrorEndsWithTwo) {
+    ToolProcess process(tool({"decode"}));
+    EXPECT_EQ(process.exitStatus(), 2);
+    EXPECT_EQ(process.output(), "");
+    EXPECT_EQ(process.errors(), "velmora-log: FILE is required\nvelmora-log --help tells more\n");
+}
+
+TEST_F(CommandLineProgramTest, HelpToAFullDiskIsTold) {
+    ToolProcess::Setup setup = tool({"--help"});
+    setup.outputFile = "/dev/full";
+    ToolProcess process(setup);
+    EXPECT_EQ(process.exitStatus(), 1);
+    EXPECT_EQ(process.errors(), "velmora-log: cannot write standard output: No space left on device\n");
+}
+
+} // namespace
+} // namespace velmora

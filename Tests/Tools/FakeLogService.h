@@ -1,0 +1,37 @@
+#pragma once
+
+#include "Platform/Linux/LinuxMessagePorts.h"
+
+#include <filesystem>
+#include <memory>
+#include <string>
+#include <vector>
+
+namespace velmora {
+
+/// A telephony service on the test's event loop that says what the test tells it to, to every client that has
+/// asked it to stream. It is gone, as one that was killed, when this ends.
+class FakeLogService {
+public:
+    /// `technology` is a short name.
+    FakeLogService(const std::filesystem::path& directory, std::string technology);
+    ~FakeLogService();
+    FakeLogService(const FakeLogService&) = delete;
+    FakeLogService& operator=(const FakeLogService&) = delete;
+
+    /// Clients that have sent their start command.
+    [[nodiscard]] std::size_t streaming() const { return _clients.size(); }
+    void send(const Data& message);
+
+private:
+    [[nodiscard]] std::optional<Data> createChannel(const Data& request);
+    [[nodiscard]] std::optional<Data> command(const std::string& client, const Data& payload);
+
+    LinuxMessagePorts _ports;
+    std::string _technology;
+    std::shared_ptr<LocalPort> _server;
+    std::vector<std::shared_ptr<LocalPort>> _channels;
+    std::vector<std::shared_ptr<RemotePort>> _clients;
+};
+
+} // namespace velmora

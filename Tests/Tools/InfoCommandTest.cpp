@@ -1,0 +1,117 @@
+#include "Tests/Tools/ToolFixture.h"
+
+#include <gmock/gmock.h>
+
+#include <filesystem>
+
+namespace velmora {
+namespace {
+
+class InfoCommandTest : public ToolTest {};
+
+TEST_F(InfoCommandTest, CountsMessagesByLogCodeWithTheirSections) {
+    const std::vector<std::uint64_t> offsets =
+        writeRecording("drive.pcapng", "Ostrel_GSM",
+                       {
+                           {at(1250), rrState(4)},                           // 17 bytes
+                           {at(0), rrState(5)},                              // 17, the earliest
+                           {at(3600'001), joined(hex("81 00"), rrState(5))}, // 19, the latest
+                           {at(1300), record(0x1234, "")},                   // 13, which no section wants
+                           {at(1400), extraRecord(0, makeDictionary())},     // SIM files
+                           {at(1500), hex("01 02 03")},                      // 3, too short
+                           {at(1600), record(0x512C, "00", 2)},              // 14, of no known type
+                           {at(1700), hex("01 02 03 04 05 06 07 08 09 0A 0B 0C")}, // 12, too short
+                       });
+    const std::size_t simSize = extraRecord(0, makeDictionary()).size();
+    ToolProcess process(tool({"info", path("drive.pcapng")}));
+    EXPECT_EQ(process.exitStatus(), 0);
+    EXPECT_EQ(process.output(), "technology: Ostrel_GSM\n"
+                                "first:      2026-11-16 05:00:00.000 UTC\n"
+                                "last:       2026-11-16 06:00:00.001 UTC\n"
+                                "duration:   3600.001 s\n"
+                                "messages:   8\n"
+                                "bytes:      " +
+                                    std::to_string(95 + simSize) +
+                                    "\n"
+                                    "prefixed:   1 (first: record 3 at offset " +
+                                    std::to_string(offsets[2]) +
+                                    ")\n"
+                                    "too short:  2 (first: record 6 at offset " +
+                                    std::to_string(offsets[5]) +
+                                    ")\n"
+                                    "wrong type: 1 (first: record 7 at offset " +
+                                    std::to_string(offsets[6]) +
+                                    ")\n"
+                                    "lost:       0\n"
+                                    "\n"
+                                    "    code     messages  sections\n"
+                                    "  0x1234            1  -\n"
+                                    "  0x512C            3  GSM RR Info\n"
+                                    "0xFF0000            1  SIM Info\n");
+    EXPECT_EQ(ownWords(process.errors()), "");
+}
+
+TEST_F(InfoCommandTest, SerializedObjectsHaveNoLogCodes) {
+    writeRecording("ifx.pcapng", "IFX", {{at(0), hex("01 02 03")}});
+    ToolProcess process(tool({"info", path("ifx.pcapng")}));
+    EXPECT_EQ(process.exitStatus(), 0);
+    EXPECT_EQ(process.output(), "technology: IFX\n"
+                                "first:      2026-11-16 05:00:00.000 UTC\n"
+                                "last:       2026-11-16 05:00:00.000 UTC\n"
+                                "duration:   0.000 s\n"
+                                "messages:   1\n"
+                                "bytes:      3\n"
+                                "lost:       0\n");
+}
+
+TEST_F(InfoCommandTest, LossIsShownAndMakesTheInputBad) {
+    const std::vector<std::uint64_t> offsets =
+        writeRecording("cut.pcapng", "Ostrel_GSM", {{at(0), rrState(4)}, {at(500), rrState(5)}});
+    std::filesystem::resize_file(path("cut.pcapng"), offsets[2] - 6);
+    const std::uint64_t length = offsets[2] - offsets[1];
+    const std::string place = "record 2 at offset " + std::to_string(offsets[1]) + ": block cut off after " +
+                              std::to_string(length - 6) + " of " + std::to_string(length) + " bytes\n";
+    ToolProcess process(tool({"info", path("cut.pcapng")}));
+    EXPECT_EQ(process.exitStatus(), 1);
+    EXPECT_EQ(process.output(), "technology: Ostrel_GSM\n"
+                                "first:      2026-11-16 05:00:00.000 UTC\n"
+                                "last:       2026-11-16 05:00:00.000 UTC\n"
+                                "duration:   0.000 s\n"
+                                "messages:   1\n"
+                                "bytes:      17\n"
+                                "prefixed:   0\n"
+                                "too short:  0\n"
+                                "wrong type: 0\n"
+                                "lost:       1 (" +
+                                    std::to_string(length - 6) +
+                                    " bytes of the file)\n"
+                                    "  " +
+                                    place +
+                                    "\n"
+                                    "    code     messages  sections\n"
+                                    "  0x512C            1  GSM RR Info\n");
+    EXPECT_EQ(ownWords(process.errors()), "velmora-log: " + path("cut.pcapng") + ": " + place);
+}
+
+TEST_F(InfoCommandTest, RecordingWithoutATechnologyIsCountedAllTheSame) {
+    writeRecording("none.pcapng", "", {{at(0), rrState(5)}});
+    ToolProcess process(tool({"info", path("none.pcapng")}));
+    EXPECT_EQ(process.exitStatus(), 1);
+    EXPECT_THAT(process.output(), testing::StartsWith("technology: not named\n"));
+    EXPECT_THAT(process.output(), testing::EndsWith("  0x512C            1  -\n"));
+    EXPECT_EQ(
+        ownWords(process.errors()),
+        "velmora-log: " + path("none.pcapng") +
+            ": names no technology, wanted one of IFX, Ostrel_GSM, Ostrel_CDMA, Ostrel_LTE, Ostrel_UTRAN2\n");
+}
+
+TEST_F(InfoCommandTest, FileThatIsNotThereIsTold) {
+    ToolProcess process(tool({"info", path("gone.pcapng")}));
+    EXPECT_EQ(process.exitStatus(), 1);
+    EXPECT_EQ(process.output(), "");
+    EXPECT_EQ(ownWords(process.errors()),
+              "velmora-log: " + path("gone.pcapng") + ": cannot open: No such file or directory\n");
+}
+
+} // namespace
+} // namespace velmora

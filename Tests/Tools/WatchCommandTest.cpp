@@ -1,0 +1,233 @@
+#include "Tests/Tools/FakeLogService.h"
+#include "Tests/Tools/ToolFixture.h"
+
+#include <gmock/gmock.h>
+
+#include <csignal>
+#include <optional>
+#include <regex>
+
+#include <termios.h>
+
+namespace velmora {
+namespace {
+
+using testing::ElementsAre;
+using testing::EndsWith;
+using testing::HasSubstr;
+using testing::StartsWith;
+
+constexpr const char* enterScreen = "\x1b[?1049h\x1b[?25l";
+constexpr const char* leaveScreen = "\x1b[?25h\x1b[?1049l";
+
+/// The text with every status line's time as "TIME".
+std::string withoutTimes(const std::string& text) {
+    static const std::regex time("Updated [0-9]{4}-[0-9]{2}-[0-9]{2} at [0-9]{2}:[0-9]{2}:[0-9]{2}");
+    return std::regex_replace(text, time, "Updated TIME");
+}
+
+class WatchCommandTest : public ToolTest {
+protected:
+    void startService(const std::string& technology = "IFX") {
+        _service.emplace(_directory / "ports", technology);
+    }
+    /// Waits until that many clients stream.
+    [[nodiscard]] bool isStreaming(std::size_t clients = 1) {
+        return eventually([&] { return _service->streaming() == clients; });
+    }
+    void sendBand(const std::string& band) {
+        const DictionaryRef display = makeDictionary();
+        display->set("Band", band);
+        _service->send(serialized(display));
+    }
+    [[nodiscard]] ToolProcess::Setup onTerminal(std::vector<std::string> arguments) const {
+        ToolProcess::Setup setup = tool(std::move(arguments));
+        setup.onTerminal = true;
+        return setup;
+    }
+
+    std::optional<FakeLogService> _service;
+};
+
+TEST_F(WatchCommandTest, PipeGetsEachRefreshAndTheLossOfTheConnection) {
+    startService();
+    ToolProcess process(tool({"watch"}));
+    ASSERT_TRUE(isStreaming());
+    sendBand("GSM 900");
+    ASSERT_TRUE(process.waitFor("Band  GSM 900\n"));
+    sendBand("GSM 1800");
+    ASSERT_TRUE(process.waitFor("Band  GSM 1800\n"));
+    _service.reset();
+    ASSERT_TRUE(process.waitFor("Connecting...\n"));
+    startService();
+    ASSERT_TRUE(isStreaming());
+    sendBand("GSM 850");
+    ASSERT_TRUE(process.waitFor("Band  GSM 850\n"));
+    process.signal(SIGINT);
+    EXPECT_EQ(process.exitStatus(), 0);
+    EXPECT_EQ(withoutTimes(process.output()), "Updated TIME\nBand  GSM 900\n"
+                                              "\n"
+                                              "Updated TIME\nBand  GSM 1800\n"
+                                              "\n"
+                                              "Connecting...\n"
+                                              "\n"
+                                              "Updated TIME\nBand  GSM 850\n");
+    _service.reset();
+    EXPECT_THAT(portFiles(), ElementsAre());
+}
+
+TEST_F(WatchCommandTest, WithoutAServiceItWaits) {
+    ToolProcess process(tool({"watch"}));
+    ASSERT_TRUE(process.waitFor("Connecting...\n"));
+    process.signal(SIGTERM);
+    EXPECT_EQ(process.exitStatus(), 0);
+    EXPECT_EQ(process.output(), "Connecting...\n");
+    EXPECT_THAT(portFiles(), ElementsAre());
+}
+
+TEST_F(WatchCommandTest, OncePrintsTheFirstRefreshAndEnds) {
+    startService("Ostrel_GSM");
+    ToolProcess process(tool({"watch", "--once"}));
+    ASSERT_TRUE(isStreaming());
+    _service->send(rrState(5));
+    EXPECT_EQ(process.exitStatus(), 0);
+    EXPECT_EQ(withoutTimes(process.output()), "Updated TIME\n"
+                                              "GSM RR Info\n"
+                                              "  RR State      RR_IDLE\n"
+                                              "  RR Sub State  0\n"
+                                              "  RR Status     1\n"
+                                              "  RR Mode       Voice\n"
+                                              "UMTS RR Info\n"
+                                              "SIM Info\n");
+}
+
+TEST_F(WatchCommandTest, ClosedPipeEndsItQuietlyWithoutARefresh) {
+    startService();
+    ToolProcess process(tool({"watch"}));
+    ASSERT_TRUE(isStreaming());
+    process.stopReading();
+    EXPECT_EQ(process.exitStatus(), 0);
+    EXPECT_EQ(ownWords(process.errors()), "");
+}
+
+TEST_F(WatchCommandTest, FullDiskIsTold) {
+    ToolProcess::Setup setup = tool({"watch"});
+    setup.outputFile = "/dev/full";
+    ToolProcess process(setup);
+    EXPECT_EQ(process.exitStatus(), 1);
+    EXPECT_EQ(ownWords(process.errors()),
+              "velmora-log: cannot write standard output: No space left on device\n");
+}
+
+TEST_F(WatchCommandTest, SeveralWatchersRunAtOnce) {
+    startService();
+    ToolProcess one(tool({"watch", "--once"}));
+    ToolProcess other(tool({"watch", "--once"}));
+    ASSERT_TRUE(isStreaming(2));
+    sendBand("GSM 900");
+    EXPECT_EQ(one.exitStatus(), 0);
+    EXPECT_EQ(other.exitStatus(), 0);
+    EXPECT_THAT(one.output(), EndsWith("\nBand  GSM 900\n"));
+    EXPECT_THAT(other.output(), EndsWith("\nBand  GSM 900\n"));
+}
+
+TEST_F(WatchCommandTest, UnreadableSimFilesEndTheProgramInTheirWords) {
+    startService("Ostrel_GSM");
+    ToolProcess process(onTerminal({"watch"}));
+    ASSERT_TRUE(isStreaming());
+    _service->send(record(0x0000, "DE AD BE EF", 0xFF));
+    EXPECT_EQ(process.exitStatus(), 1);
+    EXPECT_EQ(ownWords(process.errors()),
+              "velmora-log: the telephony service: SIM File dictionary data could not be constructed\n");
+    EXPECT_THAT(process.output(), EndsWith(leaveScreen));
+    _service.reset();
+    EXPECT_THAT(portFiles(), ElementsAre());
+}
+
+class WatchTerminalTest : public WatchCommandTest {
+protected:
+    /// 40 rows, "Row 0" to "Row 39", on a terminal of 12 rows.
+    void sendRows() {
+        const DictionaryRef display = makeDictionary();
+        for (int i = 0; i < 40; ++i)
+            display->set("Row " + std::to_string(i), "a value that leaves no room for a second column");
+        _service->send(serialized(display));
+    }
+    [[nodiscard]] static bool echoes(const ToolProcess& process) {
+        termios settings = {};
+        return ::tcgetattr(process.terminal(), &settings) == 0 && (settings.c_lflag & ECHO) != 0;
+    }
+};
+
+TEST_F(WatchTerminalTest, DrawsInPlaceScrollsAndRestores) {
+    startService();
+    ToolProcess process(onTerminal({"watch"}));
+    ASSERT_TRUE(isStreaming());
+    EXPECT_THAT(process.output(), StartsWith(enterScreen));
+    EXPECT_FALSE(echoes(process));
+    sendRows();
+    auto place = process.waitFor("1-11/40\x1b[0m");
+    ASSERT_TRUE(place);
+    EXPECT_THAT(process.output(), HasSubstr("\x1b[HRow 0 "));
+    EXPECT_THAT(process.output(), Not(HasSubstr("Row 11 ")));
+
+    process.type("j");
+    place = process.waitFor("2-12/40\x1b[0m", *place);
+    ASSERT_TRUE(place);
+    process.type("\x1b[6~");
+    place = process.waitFor("13-23/40\x1b[0m", *place);
+    ASSERT_TRUE(place);
+    process.type("\x1b[F");
+    place = process.waitFor("30-40/40\x1b[0m", *place);
+    ASSERT_TRUE(place);
+    EXPECT_THAT(process.output(), HasSubstr("Row 39 "));
+
+    process.type("q");
+    EXPECT_EQ(process.exitStatus(), 0);
+    EXPECT_THAT(process.output(), EndsWith(leaveScreen));
+    EXPECT_TRUE(echoes(process));
+    EXPECT_EQ(ownWords(process.errors()), "");
+}
+
+TEST_F(WatchTerminalTest, FollowsTheSizeOfTheWindow) {
+    startService();
+    ToolProcess process(onTerminal({"watch"}));
+    ASSERT_TRUE(isStreaming());
+    sendRows();
+    const auto place = process.waitFor("1-11/40\x1b[0m");
+    ASSERT_TRUE(place);
+    process.resize(44, 6);
+    const auto end = process.waitFor("1-5/40\x1b[0m", *place);
+    ASSERT_TRUE(end);
+    // The terminal itself puts one more carriage return before each line feed.
+    EXPECT_EQ(std::regex_replace(withoutTimes(process.output().substr(*place, *end - *place)),
+                                 std::regex("\r\r\n"), "\r\n"),
+              "\x1b[HRow 0   a value that leaves no room for a s…\r\n"
+              "Row 1   a value that leaves no room for a s…\r\n"
+              "Row 2   a value that leaves no room for a s…\r\n"
+              "Row 3   a value that leaves no room for a s…\r\n"
+              "Row 4   a value that leaves no room for a s…\r\n"
+              "\x1b[7mUpdated TIME        1-5/40\x1b[0m");
+}
+
+TEST_F(WatchTerminalTest, EndsWithTheSignalsOfAUser) {
+    for (const int number : {SIGINT, SIGTERM, SIGHUP}) {
+        ToolProcess process(onTerminal({"watch"}));
+        ASSERT_TRUE(process.waitFor("Connecting..."));
+        process.signal(number);
+        EXPECT_EQ(process.exitStatus(), 0) << number;
+        EXPECT_THAT(process.output(), EndsWith(leaveScreen));
+        EXPECT_TRUE(echoes(process));
+    }
+}
+
+TEST_F(WatchTerminalTest, InterruptKeyEndsIt) {
+    ToolProcess process(onTerminal({"watch"}));
+    ASSERT_TRUE(process.waitFor("Connecting..."));
+    process.type("\x03");
+    EXPECT_EQ(process.exitStatus(), 0);
+    EXPECT_THAT(process.output(), EndsWith(leaveScreen));
+}
+
+} // namespace
+} // namespace velmora

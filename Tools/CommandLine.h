@@ -1,0 +1,31 @@
+#pragma once
+
+#include "Platform/Linux/ProgramLog.h"
+#include "Platform/SystemLog.h"
+#include "Tools/DecodeCommand.h"
+#include "Tools/InfoCommand.h"
+#include "Tools/RecordCommand.h"
+#include "Tools/WatchCommand.h"
+
+#include <string>
+#include <variant>
+
+namespace velmora {
+
+/// What the user asked for.
+struct CommandLine {
+    /// The program has nothing to do but say something and end: help, its version, a usage error.
+    struct Words {
+        int status; ///< exit status; a usage error's words go to standard error, others to standard output
+        std::string text; ///< whole lines
+    };
+
+    LogKind log = LogKind::Stderr;
+    int logLevel = LogPriority::Error;
+    std::variant<Words, DecodeOptions, WatchOptions, RecordOptions, InfoOptions> command;
+};
+
+/// Reads the arguments, the program's name first. Never ends the program.
+[[nodiscard]] CommandLine parseCommandLine(int count, const char* const* arguments);
+
+} // namespace velmora

@@ -1,0 +1,64 @@
+#pragma once
+
+#include "Platform/SystemLog.h"
+
+#include <cstdio>
+#include <deque>
+#include <string>
+#include <string_view>
+#include <utility>
+
+namespace velmora {
+
+/// Stands before the process's system log for as long as it lives, at the log's own level, and puts it back
+/// in the end. The ones below keep log lines from running into what a command shows on the same terminal.
+class LogSubstitute : public SystemLog {
+public:
+    LogSubstitute();
+    ~LogSubstitute() override;
+    LogSubstitute(const LogSubstitute&) = delete;
+    LogSubstitute& operator=(const LogSubstitute&) = delete;
+
+protected:
+    void pass(int priority, std::string_view text);
+
+private:
+    int _level;
+    SystemLog* _earlier;
+};
+
+/// Keeps the latest lines while the screen is in use, those of the console as well, and passes them on in the
+/// end.
+class HeldLog final : public LogSubstitute {
+public:
+    static constexpr std::size_t maximumLines = 200;
+
+    HeldLog();
+    ~HeldLog() override;
+    void write(int priority, std::string_view text) override;
+    /// Passes the lines on now.
+    void release();
+
+private:
+    std::deque<std::pair<int, std::string>> _lines;
+    std::size_t _leftOut = 0;
+    char* _consoleText = nullptr;
+    std::size_t _consoleSize = 0;
+    std::FILE* _console;
+    std::FILE* _earlierConsole;
+};
+
+/// One line on standard error that is written over and over. Log lines that come in between are written in
+/// its place, and it comes back with the next `show`.
+class ProgressLine final : public LogSubstitute {
+public:
+    ~ProgressLine() override { clear(); }
+    void show(std::string_view text);
+    void clear();
+    void write(int priority, std::string_view text) override;
+
+private:
+    bool _shown = false;
+};
+
+} // namespace velmora

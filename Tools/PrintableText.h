@@ -1,0 +1,21 @@
+#pragma once
+
+#include <cstddef>
+#include <string>
+#include <string_view>
+
+namespace velmora {
+
+/// Text that a terminal shows as it stands: what comes out of a recording must not be able to steer it. Line
+/// feeds, tabs and carriage returns become "\n", "\t", "\r", other control characters "\xNN" or "\u{NN}", and
+/// a byte that is no UTF-8 becomes U+FFFD. Text without any of these is unchanged.
+[[nodiscard]] std::string printable(std::string_view text);
+
+/// The terminal columns that printable text takes: none for combining marks, two for East Asian wide
+/// characters and emoji, otherwise one a character.
+[[nodiscard]] std::size_t displayWidth(std::string_view text);
+
+/// As much of the front of printable text as fits into `columns`; what had to be cut ends in "…".
+[[nodiscard]] std::string clipped(std::string_view text, std::size_t columns);
+
+} // namespace velmora

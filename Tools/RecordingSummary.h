@@ -1,0 +1,62 @@
+#pragma once
+
+#include "LogGenerator/ClassIndex.h"
+#include "Platform/Clock.h"
+#include "Recording/MessageReader.h"
+
+#include <cstdint>
+#include <map>
+#include <optional>
+#include <string>
+
+namespace velmora {
+
+/// What is counted of a recording, message by message.
+class RecordingSummary {
+public:
+    /// Messages of one kind, and where the first of them stands.
+    struct Count {
+        std::uint64_t messages = 0;
+        std::uint64_t firstNumber = 0;
+        std::uint64_t firstOffset = 0;
+    };
+
+    /// `binary`: whether the messages are records with a header, which those of the serialized-object stream
+    /// are not.
+    explicit RecordingSummary(bool binary) : _binary(binary) {}
+
+    void add(const LoggedMessage& message);
+
+    [[nodiscard]] bool isBinary() const { return _binary; }
+    [[nodiscard]] std::uint64_t messages() const { return _messages; }
+    [[nodiscard]] std::uint64_t bytes() const { return _bytes; }
+    /// The earliest and the latest time stamp; absent without messages.
+    [[nodiscard]] const std::optional<Time>& first() const { return _first; }
+    [[nodiscard]] const std::optional<Time>& last() const { return _last; }
+    /// By log code, 0xFF0000 added for the extra stream.
+    [[nodiscard]] const std::map<std::uint32_t, Count>& codes() const { return _codes; }
+    /// Shorter than a header, which decoders drop.
+    [[nodiscard]] const Count& tooShort() const { return _tooShort; }
+    /// Of a type byte that is neither stream's, which decoders drop.
+    [[nodiscard]] const Count& wrongType() const { return _wrongType; }
+    /// With the two bytes before the record that decoders take away: not malformed.
+    [[nodiscard]] const Count& prefixed() const { return _prefixed; }
+
+private:
+    bool _binary;
+    std::uint64_t _messages = 0;
+    std::uint64_t _bytes = 0;
+    std::optional<Time> _first;
+    std::optional<Time> _last;
+    std::map<std::uint32_t, Count> _codes;
+    Count _tooShort;
+    Count _wrongType;
+    Count _prefixed;
+};
+
+/// The summary as `info` prints it. `index` names the sections that want a code; null where the technology's
+/// decoder has none.
+[[nodiscard]] std::string summaryText(const RecordingSummary& summary, const std::string& technology,
+                                      const ClassIndex* index, const MessageReader& reader);
+
+} // namespace velmora

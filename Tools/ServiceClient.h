@@ -1,0 +1,29 @@
+#pragma once
+
+#include "Model/VelmoraModel.h"
+#include "Platform/Linux/LinuxMessagePorts.h"
+#include "Platform/Linux/LinuxTelephonyService.h"
+#include "Platform/Linux/MainLoop.h"
+#include "Platform/Linux/QtMainQueue.h"
+
+namespace velmora {
+
+/// What a command that talks to the telephony service stands on: the event loop and the machine's ports,
+/// queue and clock. One a process; outlives the model that is given its platform. Main thread only.
+class ServiceClient {
+public:
+    MainLoop loop;
+    QtMainQueue queue;
+    LinuxMessagePorts ports;
+    LinuxTelephonyService telephony{ports};
+    MachineClock clock;
+
+    /// For a model whose local port has a name of this process's own, so that several watchers and recorders
+    /// and the application can be connected at the same time.
+    [[nodiscard]] ModelPlatform platform();
+};
+
+/// What messages call the other end.
+inline constexpr const char* serviceTitle = "the telephony service";
+
+} // namespace velmora

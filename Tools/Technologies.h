@@ -1,0 +1,21 @@
+#pragma once
+
+#include "LogGenerator/LogGenerator.h"
+#include "Platform/Clock.h"
+#include "Platform/Result.h"
+
+#include <memory>
+#include <string>
+#include <string_view>
+
+namespace velmora {
+
+/// The short names of the log technologies, as users write them: "IFX, Ostrel_GSM, ...".
+[[nodiscard]] std::string technologyNames();
+
+/// A decoder for the technology, named in short or by the telephony service's constant. Fails with the names
+/// that there are where it is none of them, or is empty.
+[[nodiscard]] Result<std::unique_ptr<LogGenerator>> makeDecoder(std::string_view technology,
+                                                                const Clock& clock);
+
+} // namespace velmora

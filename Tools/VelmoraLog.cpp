@@ -1,0 +1,71 @@
+#include "Tools/VelmoraLog.h"
+
+#include "Platform/Console.h"
+#include "Platform/Linux/FileResources.h"
+#include "Tools/CommandLine.h"
+#include "Tools/ExitStatus.h"
+#include "Tools/Output.h"
+#include "Tools/Report.h"
+
+#include <csignal>
+#include <cstdio>
+
+#include <fcntl.h>
+#include <unistd.h>
+
+namespace velmora {
+
+namespace {
+
+/// Where a standard stream was closed by whoever started the program, the next file opened would take its
+/// number, and log lines meant for standard error would end up in a recording.
+void keepStandardStreams() {
+    int descriptor = 0;
+    do
+        descriptor = ::open("/dev/null", O_RDONLY); // to write on it stays an error
+    while (descriptor >= 0 && descriptor <= STDERR_FILENO);
+    if (descriptor >= 0)
+        ::close(descriptor);
+}
+
+int say(const CommandLine::Words& words, Output& output) {
+    if (words.status == ExitStatus::Usage) {
+        std::fputs(words.text.c_str(), stderr);
+        return words.status;
+    }
+    output.put(words.text);
+    output.flush();
+    return output.state() == Output::State::Failed ? ExitStatus::BadInput : words.status;
+}
+
+} // namespace
+
+int runVelmoraLog(int count, const char* const* arguments) {
+    keepStandardStreams();
+    // Standard output carries the result alone.
+    redirectConsole(stderr);
+    std::signal(SIGPIPE, SIG_IGN); // a closed pipe is told by the write that finds it
+    WorkContext::takeOverTermination();
+
+    const CommandLine line = parseCommandLine(count, arguments);
+    Output output(STDOUT_FILENO);
+    if (const auto* words = std::get_if<CommandLine::Words>(&line.command))
+        return say(*words, output);
+
+    const ProgramLog log(line.log, line.logLevel, "velmora-log");
+    FileResources files;
+    setResources(&files);
+    int status = ExitStatus::Done;
+    if (const auto* decode = std::get_if<DecodeOptions>(&line.command))
+        status = runDecode(*decode, output);
+    else if (const auto* watch = std::get_if<WatchOptions>(&line.command))
+        status = runWatch(*watch, output);
+    else if (const auto* record = std::get_if<RecordOptions>(&line.command))
+        status = runRecord(*record);
+    else if (const auto* info = std::get_if<InfoOptions>(&line.command))
+        status = runInfo(*info, output);
+    setResources(nullptr);
+    return status;
+}
+
+} // namespace velmora

@@ -1,0 +1,8 @@
+#pragma once
+
+namespace velmora {
+
+/// The program `velmora-log`: all that its `main` does. Returns the exit status.
+[[nodiscard]] int runVelmoraLog(int count, const char* const* arguments);
+
+} // namespace velmora
