@@ -33,7 +33,8 @@ function(velmora_test name)
         add_dependencies(${name} ${arg_NEEDS})
     endif()
     include(GoogleTest)
-    gtest_discover_tests(${name} TEST_PREFIX "${name}." DISCOVERY_MODE PRE_TEST PROPERTIES TIMEOUT 60)
+    gtest_discover_tests(${name} TEST_PREFIX "${name}." NO_PRETTY_VALUES DISCOVERY_MODE PRE_TEST
+                         PROPERTIES TIMEOUT 60)
 endfunction()
 
 # velmora_benchmark(NAME SOURCES file... [LINK target...]): a Google Benchmark executable.
