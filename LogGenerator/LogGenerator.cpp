@@ -2,6 +2,7 @@
 
 #include "LogGenerator/GSM/GSMLogGenerator.h"
 #include "LogGenerator/OstrelGSM/Ostrel_GSMLogGenerator.h"
+#include "LogGenerator/UTRAN/UTRANLogGenerator.h"
 #include "Platform/SystemLog.h"
 #include "Platform/TelephonyService.h"
 
@@ -24,6 +25,8 @@ std::unique_ptr<LogGenerator> LogGenerator::generatorFromTechnology(std::string_
         return GSMLogGenerator::generator(clock);
     if (technology == kVoxLogChannelTechnology_Ostrel_GSM)
         return Ostrel_GSMLogGenerator::generator(clock);
+    if (technology == kVoxLogChannelTechnology_Ostrel_UTRAN2)
+        return UTRANLogGenerator::generator(clock);
     return nullptr;
 }
 

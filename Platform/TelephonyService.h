@@ -69,6 +69,8 @@ inline constexpr std::string_view kVoxCellMonitorRadioAccessTechnologyGSM =
     "kVoxCellMonitorRadioAccessTechnologyGSM";
 inline constexpr std::string_view kVoxCellMonitorRadioAccessTechnologyUMTS =
     "kVoxCellMonitorRadioAccessTechnologyUMTS";
+inline constexpr std::string_view kVoxCellMonitorRadioAccessTechnologyUTRAN =
+    "kVoxCellMonitorRadioAccessTechnologyUTRAN";
 inline constexpr std::string_view kVoxCellMonitorRadioAccessTechnologyLTE =
     "kVoxCellMonitorRadioAccessTechnologyLTE";
 inline constexpr std::string_view kVoxCellMonitorCellType = "kVoxCellMonitorCellType";

@@ -48,9 +48,61 @@ INSTANTIATE_TEST_SUITE_P(
         Folding{"ArrayElement", array({dictionary({{"A", "1"}}), "2"}), array({"1", "2"})},
         Folding{"ArrayBelowADictionary", dictionary({{"X", dictionary({{"Cells", array({"1"})}})}}),
                 dictionary({{"X", array({"1"})}})},
+        Folding{"ArrayOfOneElementStays", dictionary({{"X", array({"1"})}, {"Y", "2"}}),
+                dictionary({{"X", array({"1"})}, {"Y", "2"}})},
+        Folding{"ChainInAnArray",
+                array({dictionary({{"X", dictionary({{"Y", dictionary({{"A", "1"}, {"B", "2"}})}})}})}),
+                array({dictionary({{"A", "1"}, {"B", "2"}})})},
+        Folding{"ArrayInAnArray", array({array({dictionary({{"A", "1"}})})}), array({array({"1"})})},
+        // What is left of the one-entry dictionary at the root is not folded again.
+        Folding{"RootOfOneFoldedEntry", dictionary({{"X", dictionary({{"A", dictionary({{"B", "1"}})}})}}),
+                dictionary({{"X", "1"}})},
+        Folding{"EmptyRoot", makeDictionary(), makeDictionary()}, Folding{"EmptyArray", array({}), array({})},
         Folding{"EmptyDictionary", dictionary({{"X", makeDictionary()}}),
                 dictionary({{"X", makeDictionary()}})}),
     [](const auto& test) { return std::string(test.param.odd); });
+
+TEST(ProcessObject, GivesACopyInTheSameOrder) {
+    const DictionaryRef inner = dictionary({{"B", "1"}, {"A", "2"}});
+    const Value object = dictionary({{"Z", inner}, {"Y", "3"}, {"X", array({"4", "5"})}});
+    const Value display = GSMLogGenerator::processObject(object);
+    std::vector<std::string> keys;
+    for (const auto& [key, value] : *display.asDictionary())
+        keys.push_back(key);
+    EXPECT_THAT(keys, testing::ElementsAre("Z", "Y", "X"));
+    inner->set("B", "changed");
+    EXPECT_EQ((*(*display.asDictionary())["Z"].asDictionary())["B"], Value("1"));
+    EXPECT_EQ((*object.asDictionary())["X"].asArray()->size(), 2u);
+}
+
+struct Foreign {
+    const char* kind;
+    Value value;
+};
+
+class ForeignKindTest : public testing::TestWithParam<Foreign> {};
+
+TEST_P(ForeignKindTest, IsAnAssertionFailureWhereverItStands) {
+    const Value& value = GetParam().value;
+    const std::string wanted = std::string("Unknown object of type ") + GetParam().kind +
+                               " encountered (LogGenerator/GSM/GSMLogGenerator:78)";
+    for (const Value& object :
+         {value, Value(array({"1", value})), Value(dictionary({{"A", "1"}, {"B", value}})),
+          Value(dictionary({{"A", dictionary({{"B", array({dictionary({{"C", value}})})}})}}))}) {
+        try {
+            static_cast<void>(GSMLogGenerator::processObject(object));
+            FAIL() << "nothing was raised";
+        } catch (const AssertionFailure& failure) {
+            EXPECT_EQ(failure.what(), wanted);
+        }
+    }
+}
+
+INSTANTIATE_TEST_SUITE_P(, ForeignKindTest,
+                         testing::Values(Foreign{"none", Value()}, Foreign{"integer", 0},
+                                         Foreign{"real", 1.5}, Foreign{"boolean", true},
+                                         Foreign{"date", Date{}}, Foreign{"data", Data()}),
+                         [](const auto& test) { return std::string(test.param.kind); });
 
 class GSMLogGeneratorTest : public testing::Test {
 protected:
@@ -77,6 +129,40 @@ TEST_F(GSMLogGeneratorTest, ReadsTheBinaryForm) {
     const auto binary = writeBinaryPropertyList(dictionary({{"A", "1"}}));
     ASSERT_TRUE(binary);
     generator.updateState(state, Data::copyOf(*binary));
+    EXPECT_EQ(state["Display"], Value(dictionary({{"A", "1"}})));
+}
+
+TEST_F(GSMLogGeneratorTest, ARootThatIsNoDictionaryIsTheDisplayAllTheSame) {
+    update(array({dictionary({{"A", "1"}}), "2"}));
+    EXPECT_EQ(state["Display"], Value(array({"1", "2"})));
+    update("text");
+    EXPECT_EQ(state["Display"], Value("text"));
+}
+
+TEST_F(GSMLogGeneratorTest, ExtraInfoIsMadeAnewByEveryMessage) {
+    update(dictionary({{"A", "1"}}));
+    state["ExtraInfo"].asDictionary()->set("Rate", "1");
+    update(dictionary({{"A", "1"}}));
+    EXPECT_EQ(state["ExtraInfo"], Value(makeDictionary()));
+}
+
+TEST_F(GSMLogGeneratorTest, SaveContentsWithoutHistoryAreEmpty) {
+    EXPECT_TRUE(generator.getSaveContentsFromState(state)->empty());
+}
+
+TEST_F(GSMLogGeneratorTest, SaveContentsAreAListOfTheirOwn) {
+    update(dictionary({{"A", "1"}}));
+    static_cast<void>(generator.generateLogUsingState(state));
+    generator.getSaveContentsFromState(state)->clear();
+    EXPECT_EQ(state["History"].asArray()->size(), 1u);
+    EXPECT_EQ(generator.getSaveContentsFromState(state)->size(), 1u);
+}
+
+TEST_F(GSMLogGeneratorTest, AMessageThatRaisesLeavesTheStateAsItWas) {
+    update(dictionary({{"A", "1"}}));
+    EXPECT_THROW(update(dictionary({{"A", 2}})), AssertionFailure);
+    EXPECT_THROW(generator.updateState(state, Data(std::vector<std::uint8_t>{1, 2, 3})), AssertionFailure);
+    EXPECT_EQ(state["DisplayState"], Value(dictionary({{"A", "1"}})));
     EXPECT_EQ(state["Display"], Value(dictionary({{"A", "1"}})));
 }
 

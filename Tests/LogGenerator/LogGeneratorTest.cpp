@@ -2,9 +2,11 @@
 
 #include "LogGenerator/GSM/GSMLogGenerator.h"
 #include "LogGenerator/OstrelGSM/Ostrel_GSMLogGenerator.h"
+#include "LogGenerator/UTRAN/UTRANLogGenerator.h"
 #include "Platform/TelephonyService.h"
 #include "Tests/Support/CapturedLog.h"
 #include "Tests/Support/FakeClock.h"
+#include "Tests/Support/FakeResources.h"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
@@ -26,6 +28,9 @@ bool selects(std::string_view technology) {
 TEST(TechnologyTest, ConstantSelectsItsDecoderByValue) {
     EXPECT_TRUE(selects<GSMLogGenerator>(std::string("kVoxLogChannelTechnology_IFX")));
     EXPECT_TRUE(selects<Ostrel_GSMLogGenerator>(std::string("kVoxLogChannelTechnology_Ostrel_GSM")));
+    FakeResources resources;
+    resources.put("Ostrel_UTRAN", "plist", Value(makeDictionary())); // chosen by what there is
+    EXPECT_TRUE(selects<UTRANLogGenerator>(std::string("kVoxLogChannelTechnology_Ostrel_UTRAN2")));
 }
 
 TEST(TechnologyTest, AnyOtherNameSelectsNoneAndSaysNothing) {

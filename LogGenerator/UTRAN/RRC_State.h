@@ -1,0 +1,17 @@
+#pragma once
+
+#include "LogGenerator/Base.h"
+
+namespace velmora {
+
+/// "RRC Info": the state of the radio-resource control.
+class RRC_State final : public Base {
+public:
+    [[nodiscard]] std::string_view getSectionName() const override { return "RRC Info"; }
+    [[nodiscard]] std::vector<std::uint32_t> getLogCodeArray() const override { return {0xD0E0}; }
+    /// A record below 15 bytes is warned of and decoded all the same: what it lacks reads as version 0 and as
+    /// mode 255, which is unknown.
+    void updateWithData(const Data& data, std::uint32_t logCode) override;
+};
+
+} // namespace velmora

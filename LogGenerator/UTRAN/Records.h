@@ -1,0 +1,30 @@
+#pragma once
+
+#include "LogGenerator/Field.h"
+
+#include <cstdint>
+
+namespace velmora::UTRAN {
+
+/// 0xD00C, the transport channels' quality, as "TRCH BLER" and "CCTRCH SIR" read it. Both counts lie in the
+/// 16 bits at 14: the transport channels' in bits 6 to 11, the coded composite ones' in the four above.
+namespace quality {
+inline constexpr std::uint32_t code = 0xD00C;
+inline constexpr std::size_t minimumLength = 17;
+
+inline constexpr Where transportChannels = bitsAt(14, 6, 6);
+inline constexpr Where compositeChannels = bitsAt(15, 4, 4);
+static_assert(transportChannels.end() <= minimumLength && compositeChannels.end() <= minimumLength);
+
+/// The entries of the transport channels follow the minimum.
+inline constexpr std::size_t transportChannelLength = 2;
+
+/// Where the composite channels' entries begin. The 34 bytes that each transport channel moves them by are
+/// not what its entry takes; they are kept as they stand.
+constexpr std::size_t firstCompositeChannel(std::size_t transportChannelCount) {
+    return 289 + 34 * transportChannelCount;
+}
+inline constexpr std::size_t compositeChannelLength = 8;
+} // namespace quality
+
+} // namespace velmora::UTRAN

@@ -1,0 +1,16 @@
+#include "LogGenerator/UTRAN/UTRANClassIndex.h"
+
+namespace velmora {
+
+UTRANClassIndex::UTRANClassIndex() {
+    create(rrc_state);
+    create(servingCellInfo);
+    create(tdMeasurements);
+    create(gsmMeasurements);
+    create(trchMeasurements);
+    create(cctrchMeasurements);
+    create(pdpList);
+    create(simInfo);
+}
+
+} // namespace velmora

@@ -1,0 +1,18 @@
+#pragma once
+
+#include "LogGenerator/OstrelLogGenerator2.h"
+
+namespace velmora {
+
+/// The decoder of the technology Ostrel UTRAN2 (TD-SCDMA). Its template has no fixed name: it is the first of
+/// the application's property-list resources whose name contains "UTRAN" in whatever case.
+class UTRANLogGenerator final : public OstrelLogGenerator2 {
+public:
+    /// Null, with an error line, where there is no such template.
+    [[nodiscard]] static std::unique_ptr<UTRANLogGenerator> generator(const Clock& clock);
+
+private:
+    UTRANLogGenerator(std::string templateName, const Clock& clock);
+};
+
+} // namespace velmora
