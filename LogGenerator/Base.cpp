@@ -89,9 +89,13 @@ Array Base::rows(const CountedList& list, const Layout& layout, std::uint32_t lo
 }
 
 void Base::reportMissingEntries(const CountedList& list, std::uint32_t logCode) {
-    if (const std::size_t whole = list.whole(); whole < list.count())
+    reportMissingEntries(list.whole(), list.count(), logCode);
+}
+
+void Base::reportMissingEntries(std::size_t whole, std::size_t count, std::uint32_t logCode) {
+    if (whole < count)
         logFormat(LogPriority::Error, "Record 0x%04X: %d of %d entries", logCode, static_cast<int>(whole),
-                  static_cast<int>(list.count()));
+                  static_cast<int>(count));
 }
 
 void Base::clearElements() const {

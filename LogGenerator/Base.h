@@ -86,6 +86,8 @@ protected:
     [[nodiscard]] static Array rows(const CountedList& list, const Layout& layout, std::uint32_t logCode);
     /// That error line, where it is due.
     static void reportMissingEntries(const CountedList& list, std::uint32_t logCode);
+    /// The same for a list whose entries' lengths differ: `whole` of `count` lie inside the record.
+    static void reportMissingEntries(std::size_t whole, std::size_t count, std::uint32_t logCode);
 
     /// The array node emptied or refilled as above; nothing without a node.
     void clearElements() const;

@@ -1,6 +1,7 @@
 #include "LogGenerator/LogGenerator.h"
 
 #include "LogGenerator/GSM/GSMLogGenerator.h"
+#include "LogGenerator/LTE/LTELogGenerator.h"
 #include "LogGenerator/OstrelGSM/Ostrel_GSMLogGenerator.h"
 #include "LogGenerator/UTRAN/UTRANLogGenerator.h"
 #include "Platform/SystemLog.h"
@@ -25,6 +26,8 @@ std::unique_ptr<LogGenerator> LogGenerator::generatorFromTechnology(std::string_
         return GSMLogGenerator::generator(clock);
     if (technology == kVoxLogChannelTechnology_Ostrel_GSM)
         return Ostrel_GSMLogGenerator::generator(clock);
+    if (technology == kVoxLogChannelTechnology_Ostrel_LTE)
+        return LTELogGenerator::generator(clock);
     if (technology == kVoxLogChannelTechnology_Ostrel_UTRAN2)
         return UTRANLogGenerator::generator(clock);
     return nullptr;

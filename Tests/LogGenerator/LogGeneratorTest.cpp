@@ -1,6 +1,7 @@
 #include "LogGenerator/LogGenerator.h"
 
 #include "LogGenerator/GSM/GSMLogGenerator.h"
+#include "LogGenerator/LTE/LTELogGenerator.h"
 #include "LogGenerator/OstrelGSM/Ostrel_GSMLogGenerator.h"
 #include "LogGenerator/UTRAN/UTRANLogGenerator.h"
 #include "Platform/TelephonyService.h"
@@ -28,6 +29,7 @@ bool selects(std::string_view technology) {
 TEST(TechnologyTest, ConstantSelectsItsDecoderByValue) {
     EXPECT_TRUE(selects<GSMLogGenerator>(std::string("kVoxLogChannelTechnology_IFX")));
     EXPECT_TRUE(selects<Ostrel_GSMLogGenerator>(std::string("kVoxLogChannelTechnology_Ostrel_GSM")));
+    EXPECT_TRUE(selects<LTELogGenerator>(std::string("kVoxLogChannelTechnology_Ostrel_LTE")));
     FakeResources resources;
     resources.put("Ostrel_UTRAN", "plist", Value(makeDictionary())); // chosen by what there is
     EXPECT_TRUE(selects<UTRANLogGenerator>(std::string("kVoxLogChannelTechnology_Ostrel_UTRAN2")));

@@ -1,0 +1,15 @@
+#pragma once
+
+#include "LogGenerator/OstrelLogGenerator2.h"
+
+namespace velmora {
+
+/// The decoder of the technology Ostrel LTE: the template "LTE" with its class index.
+class LTELogGenerator final : public OstrelLogGenerator2 {
+public:
+    explicit LTELogGenerator(const Clock& clock);
+    ~LTELogGenerator() override;
+    [[nodiscard]] static std::unique_ptr<LTELogGenerator> generator(const Clock& clock);
+};
+
+} // namespace velmora

@@ -1,0 +1,86 @@
+#include "LogGenerator/LTE/LTEServingCellInfo.h"
+
+#include "LogGenerator/CellFields.h"
+#include "LogGenerator/ExtraPayload.h"
+#include "Platform/SystemLog.h"
+#include "Platform/TelephonyService.h"
+
+namespace velmora {
+
+namespace {
+
+/// By the number of resource blocks.
+constexpr EnumText bandwidthRows[] = {
+    {6, "1.4 MHz"}, {15, "3 MHz"}, {25, "5 MHz"}, {50, "10 MHz"}, {75, "15 MHz"}, {100, "20 MHz"},
+};
+constexpr EnumTexts bandwidths(bandwidthRows, "Unknown");
+
+constexpr Field antennaFields[] = {
+    {"Num Tx Antennas", u8At(20), integer("%d")},
+};
+constexpr Layout antennas = layout(22, antennaFields); // 0xB0C1
+
+constexpr std::size_t cellMinimumLength = 38; // 0xB0C2
+constexpr Field carrierFields[] = {
+    {"Physical Cell ID", u16At(14), integer("%d")},
+    {"Download Frequency", u16At(16), integer("%d")},
+    {"Upload Frequency", u16At(18), integer("%d")},
+};
+constexpr Layout carrier = layout(cellMinimumLength, carrierFields);
+constexpr Field identityFields[] = {
+    {"Download Bandwidth", u8At(20), text(bandwidths)}, {"Upload Bandwidth", u8At(21), text(bandwidths)},
+    {"Cell Identity", u32At(22), integer("%d")},        {"Tracking Area Code", u16At(26), integer("%d")},
+    {"Freq Band Indicator", u32At(28), integer("%d")},
+};
+constexpr Layout identity = layout(cellMinimumLength, identityFields);
+
+constexpr CellField servingCellFields[] = {
+    {kVoxCellMonitorTAC, CellNumber::Whole, "Tracking Area Code", integer("%d"),
+     "Serving Cell Info: Failed to retrieve TAC\n"},
+    {kVoxCellMonitorCellId, CellNumber::Whole, "Cell Identity", integer("%d"),
+     "Serving Cell Info: Failed to retrieve Cell ID\n"},
+    {kVoxCellMonitorPID, CellNumber::Whole, "Physical Cell ID", integer("%d"),
+     "Serving Cell Info: Failed to retrieve Physical Cell ID\n"},
+    {kVoxCellMonitorBandInfo, CellNumber::Whole, "Freq Band Indicator", integer("%d"),
+     "Serving Cell Info: Failed to retrieve Freq Band Indicator\n"},
+    {kVoxCellMonitorUARFCN, CellNumber::Whole, "UARFCN", integer("%d"),
+     "Serving Cell Info: Failed to retrieve UARFCN\n"},
+};
+
+} // namespace
+
+void LTEServingCellInfo::updateWithData(const Data& data, std::uint32_t logCode) {
+    logLine(LogPriority::Warning, "LTE Serving Cell Info"); // not the section's name
+    const Record record(data);
+    switch (logCode) {
+    case 0xB0C1:
+        // Shown, and then reported as if it were unknown: both are meant.
+        if (show(record, antennas))
+            unknownLogMessage(logCode);
+        break;
+    case 0xB0C2: showCell(record); break;
+    case 0xFF0001: showServingCell(data); break;
+    default: unknownLogMessage(logCode);
+    }
+}
+
+void LTEServingCellInfo::showCell(const Record& record) {
+    if (!show(record, carrier))
+        return;
+    // The telephony service's name for the downlink frequency goes when the baseband's arrives.
+    if (const DictionaryRef node = dictionary())
+        node->remove("UARFCN");
+    show(record, identity);
+}
+
+void LTEServingCellInfo::showServingCell(const Data& data) {
+    const CellInfoArrayReader reader(data);
+    const Array* cells = reader.cells();
+    if (!cells)
+        return;
+    if (const Dictionary* serving =
+            firstCell(*cells, kVoxCellMonitorRadioAccessTechnologyLTE, kVoxCellMonitorCellTypeServing))
+        writeCellFields(dictionary().get(), *serving, servingCellFields);
+}
+
+} // namespace velmora

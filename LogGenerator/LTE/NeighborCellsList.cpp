@@ -1,0 +1,64 @@
+#include "LogGenerator/LTE/NeighborCellsList.h"
+
+#include "LogGenerator/LTE/Records.h"
+#include "Platform/SystemLog.h"
+
+namespace velmora {
+
+using LTE::NeighborRecord;
+
+namespace {
+
+constexpr Where physicalCellID = bitsAt(0, 0, 9);
+
+// Meant as they stand: both antennas are read from the same bits, and an RSRP step is half a decibel, twice
+// the serving cell's.
+constexpr Field cellFields[] = {
+    {"Physical Cell ID", physicalCellID, integer("%d")},
+    {"Measured RSSI", bitsAt(1, 1, 8), real("%4.2f dBm", 0.5, -140)},
+    {"Measured RSRP", bitsAt(2, 1, 9), real("%4.2f dBm", 0.5, -140)},
+    {"Average RSRP", bitsAt(4, 0, 9), real("%4.2f dBm", 0.5, -140)},
+    {"Measured RSRQ", bitsAt(5, 1, 7), real("%4.2f dB", 0.25, -30)},
+    {"Average RSRQ", bitsAt(6, 0, 7), real("%4.2f dB", 0.25, -30)},
+    {"Srxlev", bitsAt(6, 7, 7), integer("%d dBm", -30)},
+    {"Frequency Offset", u16At(8), integer("%d")},
+    {"Ant 0 Frame Offset", bitsAt(12, 0, 11), integer("%d")},
+    {"Ant 0 Sample Offset", bitsAt(13, 3, 19), integer("%d")},
+    {"Ant 1 Frame Offset", bitsAt(12, 0, 11), integer("%d")},
+    {"Ant 1 Sample Offset", bitsAt(13, 3, 19), integer("%d")},
+};
+constexpr Layout cell = layout(NeighborRecord::cellLength, cellFields);
+
+void trace(const Record& entry) {
+    logFormat(LogPriority::Warning, "Physical Cell ID: %d\n", static_cast<int>(physicalCellID.read(entry)));
+    for (const Field& field : cell.fields)
+        if (field.show.kind == Show::Kind::Real) {
+            // One text for all five, on purpose.
+            const auto raw = static_cast<double>(field.where.read(entry));
+            logFormat(LogPriority::Warning, "Measured RSSI: %lf\n",
+                      raw * field.show.scale + field.show.offset);
+        }
+}
+
+} // namespace
+
+void NeighborCellsList::updateWithData(const Data& data, std::uint32_t logCode) {
+    logLine(LogPriority::Warning, getSectionName());
+    if (logCode != NeighborRecord::code) {
+        unknownLogMessage(logCode);
+        return;
+    }
+    const Record record(data);
+    if (record.size() < NeighborRecord::minimumLength)
+        return;
+    clearElements();
+    const NeighborRecord measurement(record);
+    const CountedList& cells = measurement.cells();
+    logFormat(LogPriority::Warning, "Number of neighboring cells being reported: %d\n",
+              static_cast<int>(cells.count()));
+    for (std::size_t i = 0; i < cells.whole(); ++i)
+        trace(cells[i]);
+    replaceElements(rows(cells, cell, logCode));
+}
+
+} // namespace velmora

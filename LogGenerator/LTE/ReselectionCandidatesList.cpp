@@ -1,0 +1,89 @@
+#include "LogGenerator/LTE/ReselectionCandidatesList.h"
+
+#include "LogGenerator/LTE/Records.h"
+#include "Platform/SystemLog.h"
+
+#include <iterator>
+
+namespace velmora {
+
+using LTE::ReselectionRecord;
+
+namespace {
+
+constexpr EnumText ratTypeRows[] = {
+    {0, "LTE"}, {1, "UTRAN"}, {2, "GERAN"}, {3, "CDMA1XRTT"}, {4, "CDMAHRPD"},
+};
+constexpr EnumTexts ratTypes(ratTypeRows, "??");
+constexpr Where ratType = u16At(2);
+
+constexpr Field headerFields[] = {
+    {"Candidate Priority", u16At(0), integer("%d")},
+    {"Candidate RAT Type", ratType, text(ratTypes)},
+};
+constexpr Layout header = layout(ReselectionRecord::stride, headerFields);
+
+// What belongs to the radio technology; offsets count from the candidate's header, like the header's own.
+constexpr Field lteFields[] = {
+    {"E ARFCN", u16At(4), integer("%d")}, // with a blank, unlike the other sections' "E-ARFCN"
+    {"Cell ID", bitsAt(6, 7, 9), integer("%d")},
+};
+constexpr Field utranFields[] = {
+    {"U ARFCN", u16At(4), integer("%d")},
+    {"PSC", u16At(6), integer("%d")},
+};
+constexpr Field geranFields[] = {
+    {"ARFCN", u16At(4), integer("%d")},
+    {"Band", u8At(6), integer("%d")},
+    {"BSIC ID", u8At(7), integer("%d")},
+};
+constexpr Field cdmaFields[] = {
+    {"Band", u8At(4), integer("%d")},
+    {"Channel", u16At(8), integer("%d")},
+    {"Pilot", u16At(10), integer("%d")},
+};
+/// By RAT type; the lengths are the candidate's, header included.
+constexpr Layout details[] = {
+    layout(8, lteFields),   layout(8, utranFields), layout(8, geranFields),
+    layout(12, cdmaFields), layout(12, cdmaFields),
+};
+static_assert(std::size(details) == std::size(ratTypeRows));
+constexpr Layout noDetails = {ReselectionRecord::stride, {}};
+
+const Layout& detailsOf(const Record& candidate) {
+    const auto type = static_cast<std::size_t>(ratType.read(candidate));
+    return type < std::size(details) ? details[type] : noDetails;
+}
+
+} // namespace
+
+void ReselectionCandidatesList::updateWithData(const Data& data, std::uint32_t logCode) {
+    logLine(LogPriority::Warning, getSectionName());
+    if (logCode != ReselectionRecord::code) {
+        unknownLogMessage(logCode);
+        return;
+    }
+    const Record record(data);
+    if (record.size() < ReselectionRecord::minimumLength)
+        return;
+    clearElements();
+    const ReselectionRecord reselection(record);
+    const CountedList headers = reselection.candidates(header.minimumLength);
+    if (headers.count() == 0)
+        return;
+    Array rows;
+    for (std::size_t i = 0; i < headers.whole(); ++i) {
+        const Layout& detail = detailsOf(headers[i]);
+        const CountedList candidates = reselection.candidates(detail.minimumLength);
+        if (i >= candidates.whole())
+            break;
+        const DictionaryRef row = makeDictionary();
+        writeFields(*row, candidates[i], header);
+        writeFields(*row, candidates[i], detail);
+        rows.append(row);
+    }
+    reportMissingEntries(rows.size(), headers.count(), logCode);
+    replaceElements(rows);
+}
+
+} // namespace velmora

@@ -1,0 +1,29 @@
+#include "LogGenerator/LTE/ReselectionCandidatesMisc.h"
+
+#include "LogGenerator/LTE/Records.h"
+#include "Platform/SystemLog.h"
+
+namespace velmora {
+
+using LTE::ReselectionRecord;
+
+namespace {
+
+constexpr Field headerFields[] = {
+    {"Version", u8At(13), integer("%d")},
+    {"Serving EARFCN", u16At(15), integer("%d")},
+    {"Serving Cell ID", u16At(17), integer("%d")},
+};
+constexpr Layout header = layout(ReselectionRecord::minimumLength, headerFields);
+
+} // namespace
+
+void ReselectionCandidatesMisc::updateWithData(const Data& data, std::uint32_t logCode) {
+    logLine(LogPriority::Warning, getSectionName());
+    if (logCode == ReselectionRecord::code)
+        show(Record(data), header);
+    else
+        unknownLogMessage(logCode);
+}
+
+} // namespace velmora

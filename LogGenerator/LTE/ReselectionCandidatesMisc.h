@@ -1,0 +1,15 @@
+#pragma once
+
+#include "LogGenerator/Base.h"
+
+namespace velmora {
+
+/// "Reselection Candidates": the cell that is to be left.
+class ReselectionCandidatesMisc final : public Base {
+public:
+    [[nodiscard]] std::string_view getSectionName() const override { return "Reselection Candidates"; }
+    [[nodiscard]] std::vector<std::uint32_t> getLogCodeArray() const override { return {0xB186}; }
+    void updateWithData(const Data& data, std::uint32_t logCode) override;
+};
+
+} // namespace velmora

@@ -1,0 +1,44 @@
+#include "LogGenerator/LTE/ServingCellMeasurement.h"
+
+#include "Platform/SystemLog.h"
+
+namespace velmora {
+
+namespace {
+
+// Meant as they stand: the maximum transmit power is compared with 64 although its 6 bits never reach it, of
+// the two searches the one is shown in dB and the other in dBm, and the RSRQ offset is not that of connected
+// mode (-20).
+constexpr Field measurementFields[] = {
+    {"Version", u8At(13), integer("%d")},
+    {"E-ARFCN", u16At(17), integer("%d")},
+    {"Physical Cell ID", bitsAt(19, 0, 9), integer("%d")},
+    {"Serving Layer Priority", bitsAt(20, 1, 4), integer("%d")},
+    {"Measured RSRP", bitsAt(21, 0, 9), real("%4.2f dBm", 0.25, -140)},
+    {"Average RSRP", bitsAt(22, 1, 9), real("%4.2f dBm", 0.25, -140)},
+    {"Measured RSRQ", bitsAt(23, 2, 7), real("%4.2f dB", 0.25, -30)},
+    {"Average RSRQ", bitsAt(24, 1, 7), real("%4.2f dB", 0.25, -30)},
+    {"Measured RSSI", bitsAt(25, 0, 9), real("%4.2f dBm", 0.5, -140)},
+    {"Qrxlevmin", bitsAt(26, 1, 6), integer("%d dBm", -140, 2)},
+    {"P_Max", bitsAt(26, 7, 7), unless(64, "Not Present", integer("%d dBm", -30))},
+    {"Max UE Tx Power", bitsAt(27, 6, 6), unless(64, "Not Present", integer("%d dBm", -30))},
+    {"Srxlev", bitsAt(29, 0, 7), integer("%d dBm", -30)},
+    {"Num of Consecutive DRX Cycles of S < 0", bitsAt(29, 7, 6), integer("%d")},
+    {"S Intra Search", bitsAt(30, 5, 6), unless(32, "Not Present", integer("%d dB", 0, 2))},
+    {"S Non Intra Search", bitsAt(31, 3, 6), unless(32, "Not Present", integer("%d dBm", 0, 2))},
+    {"Measurement Rules Updated", bitsAt(32, 1, 1), flag("True", "False")},
+    {"Measurement Rules", bitsAt(32, 2, 4), integer("%d")},
+};
+constexpr Layout measurement = layout(33, measurementFields); // 0xB17F
+
+} // namespace
+
+void ServingCellMeasurement::updateWithData(const Data& data, std::uint32_t logCode) {
+    logLine(LogPriority::Warning, getSectionName());
+    if (logCode == 0xB17F)
+        show(Record(data), measurement);
+    else
+        unknownLogMessage(logCode);
+}
+
+} // namespace velmora

@@ -1,0 +1,15 @@
+#pragma once
+
+#include "LogGenerator/Base.h"
+
+namespace velmora {
+
+/// "Serving Cell Measurements": the serving cell as idle mode measures it, and what its selection depends on.
+class ServingCellMeasurement final : public Base {
+public:
+    [[nodiscard]] std::string_view getSectionName() const override { return "Serving Cell Measurements"; }
+    [[nodiscard]] std::vector<std::uint32_t> getLogCodeArray() const override { return {0xB17F}; }
+    void updateWithData(const Data& data, std::uint32_t logCode) override;
+};
+
+} // namespace velmora
