@@ -1,5 +1,6 @@
 #include "LogGenerator/LogGenerator.h"
 
+#include "LogGenerator/C2K/C2KLogGenerator.h"
 #include "LogGenerator/GSM/GSMLogGenerator.h"
 #include "LogGenerator/LTE/LTELogGenerator.h"
 #include "LogGenerator/OstrelGSM/Ostrel_GSMLogGenerator.h"
@@ -26,6 +27,8 @@ std::unique_ptr<LogGenerator> LogGenerator::generatorFromTechnology(std::string_
         return GSMLogGenerator::generator(clock);
     if (technology == kVoxLogChannelTechnology_Ostrel_GSM)
         return Ostrel_GSMLogGenerator::generator(clock);
+    if (technology == kVoxLogChannelTechnology_Ostrel_CDMA)
+        return C2KLogGenerator::generator(clock);
     if (technology == kVoxLogChannelTechnology_Ostrel_LTE)
         return LTELogGenerator::generator(clock);
     if (technology == kVoxLogChannelTechnology_Ostrel_UTRAN2)

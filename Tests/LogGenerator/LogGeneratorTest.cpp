@@ -1,5 +1,6 @@
 #include "LogGenerator/LogGenerator.h"
 
+#include "LogGenerator/C2K/C2KLogGenerator.h"
 #include "LogGenerator/GSM/GSMLogGenerator.h"
 #include "LogGenerator/LTE/LTELogGenerator.h"
 #include "LogGenerator/OstrelGSM/Ostrel_GSMLogGenerator.h"
@@ -29,6 +30,7 @@ bool selects(std::string_view technology) {
 TEST(TechnologyTest, ConstantSelectsItsDecoderByValue) {
     EXPECT_TRUE(selects<GSMLogGenerator>(std::string("kVoxLogChannelTechnology_IFX")));
     EXPECT_TRUE(selects<Ostrel_GSMLogGenerator>(std::string("kVoxLogChannelTechnology_Ostrel_GSM")));
+    EXPECT_TRUE(selects<C2KLogGenerator>(std::string("kVoxLogChannelTechnology_Ostrel_CDMA")));
     EXPECT_TRUE(selects<LTELogGenerator>(std::string("kVoxLogChannelTechnology_Ostrel_LTE")));
     FakeResources resources;
     resources.put("Ostrel_UTRAN", "plist", Value(makeDictionary())); // chosen by what there is

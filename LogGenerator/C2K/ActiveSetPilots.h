@@ -1,0 +1,14 @@
+#pragma once
+
+#include "LogGenerator/C2K/LogCodeParser.h"
+
+namespace velmora::C2K {
+
+/// EV-DO active set: the pilots with their energies.
+class ActiveSetPilots final : public LogCodeParser {
+public:
+    [[nodiscard]] std::uint16_t logCode() const override { return 0x12B6; }
+    void parse(const Record& record, Dictionary& state, const Publisher& publisher) const override;
+};
+
+} // namespace velmora::C2K

@@ -1,0 +1,40 @@
+#pragma once
+
+#include "LogGenerator/OstrelLogGenerator.h"
+
+namespace velmora {
+
+/// The decoder of the technology Ostrel CDMA (CDMA2000 1x and EV-DO). It has no sections: the template
+/// "C2KTemplate" says which value stands under which label, and eight parsers, one a log code, put their
+/// values there through the lookup that is made of it. The generator holds nothing but the raw records since
+/// the last display; all else is in the state, so that a new decoder goes on where an earlier one ended.
+///
+/// State keys beside LogGenerator's: "Template" (the template as it was loaded), "Lookup" (value key to array
+/// of {"key": label, "dict": the display dictionary that holds it}), and the parsers' running values:
+/// "TrafficFER", "FLDataSeqNum", "FLDataSent", "RLDataSeqNum", "RLDataSent", with copies of the latter four
+/// in "ExtraInfo".
+class C2KLogGenerator final : public OstrelLogGenerator {
+public:
+    explicit C2KLogGenerator(const Clock& clock) : OstrelLogGenerator(clock) {}
+    [[nodiscard]] static std::unique_ptr<C2KLogGenerator> generator(const Clock& clock);
+
+    [[nodiscard]] DictionaryRef getStartCommand() const override;
+    void updateState(Dictionary& state, const Data& data) override;
+    [[nodiscard]] Value generateLogUsingState(Dictionary& state) override;
+
+    /// Decodes one message and keeps its record, less prefix, for the log where its code is one of the eight,
+    /// whether or not the parser accepted it. `lookup`: null where the display could not be built; then the
+    /// parsers show nothing. A message below 13 bytes as it arrived is dropped silently.
+    void updateFromLog(const Data& data, const Dictionary* lookup, Dictionary& state);
+
+    /// Fills display and lookup from a template: a dictionary becomes a sub-screen, "_sorted" is copied, any
+    /// other string is the value key that its label shows and an empty text until there is a value. Values of
+    /// other kinds are left out.
+    static void processTemplate(const Dictionary& source, const DictionaryRef& display, Dictionary& lookup);
+
+    /// The state's display, which the first call builds; none, with an error line, where there is no template
+    /// (it is looked for again on the next call).
+    [[nodiscard]] static Value getDisplayFromState(Dictionary& state);
+};
+
+} // namespace velmora

@@ -1,0 +1,14 @@
+#pragma once
+
+#include "LogGenerator/C2K/LogCodeParser.h"
+
+namespace velmora::C2K {
+
+/// Receiver fingers: the carrier-to-interference ratio of each assigned one.
+class FingerC2I final : public LogCodeParser {
+public:
+    [[nodiscard]] std::uint16_t logCode() const override { return 0x108A; }
+    void parse(const Record& record, Dictionary& state, const Publisher& publisher) const override;
+};
+
+} // namespace velmora::C2K

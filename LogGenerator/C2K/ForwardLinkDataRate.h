@@ -1,0 +1,14 @@
+#pragma once
+
+#include "LogGenerator/C2K/LogCodeParser.h"
+
+namespace velmora::C2K {
+
+/// EV-DO forward-link data rate.
+class ForwardLinkDataRate final : public LogCodeParser {
+public:
+    [[nodiscard]] std::uint16_t logCode() const override { return 0x1192; }
+    void parse(const Record& record, Dictionary& state, const Publisher& publisher) const override;
+};
+
+} // namespace velmora::C2K

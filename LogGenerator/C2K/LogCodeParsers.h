@@ -1,0 +1,16 @@
+#pragma once
+
+#include "LogGenerator/C2K/LogCodeParser.h"
+
+#include <cstdint>
+#include <span>
+
+namespace velmora::C2K {
+
+/// All parsers, in the order in which the start command names their codes.
+[[nodiscard]] std::span<const LogCodeParser* const> logCodeParsers();
+
+/// The parser of that code; null when there is none.
+[[nodiscard]] const LogCodeParser* parserOfCode(std::uint32_t logCode);
+
+} // namespace velmora::C2K

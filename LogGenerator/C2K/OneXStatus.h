@@ -1,0 +1,15 @@
+#pragma once
+
+#include "LogGenerator/C2K/LogCodeParser.h"
+
+namespace velmora::C2K {
+
+/// 1x status: device state, both receive chains, active set. Outside a traffic period it closes the average
+/// of the frame error rate (see TrafficFER).
+class OneXStatus final : public LogCodeParser {
+public:
+    [[nodiscard]] std::uint16_t logCode() const override { return 0x119C; }
+    void parse(const Record& record, Dictionary& state, const Publisher& publisher) const override;
+};
+
+} // namespace velmora::C2K

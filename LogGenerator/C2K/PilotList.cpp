@@ -1,0 +1,13 @@
+#include "LogGenerator/C2K/PilotList.h"
+
+#include "LogGenerator/NumberFormat.h"
+
+#include <cmath>
+
+namespace velmora::C2K {
+
+std::string decibels(double ratio) {
+    return std::string(NumberText("%+.2f dB", 10 * std::log10(ratio)).text());
+}
+
+} // namespace velmora::C2K

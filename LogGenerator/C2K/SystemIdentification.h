@@ -1,0 +1,14 @@
+#pragma once
+
+#include "LogGenerator/C2K/LogCodeParser.h"
+
+namespace velmora::C2K {
+
+/// The serving system: its identities, and how it stands to the home system.
+class SystemIdentification final : public LogCodeParser {
+public:
+    [[nodiscard]] std::uint16_t logCode() const override { return 0x134F; }
+    void parse(const Record& record, Dictionary& state, const Publisher& publisher) const override;
+};
+
+} // namespace velmora::C2K

@@ -1,0 +1,15 @@
+#pragma once
+
+#include "LogGenerator/C2K/LogCodeParser.h"
+
+namespace velmora::C2K {
+
+/// 1x traffic frame error rate: an average over the frames of a traffic period, kept in the state under
+/// "TrafficFER" as a fraction.
+class TrafficFER final : public LogCodeParser {
+public:
+    [[nodiscard]] std::uint16_t logCode() const override { return 0x119D; }
+    void parse(const Record& record, Dictionary& state, const Publisher& publisher) const override;
+};
+
+} // namespace velmora::C2K

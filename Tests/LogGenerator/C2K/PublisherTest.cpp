@@ -1,0 +1,65 @@
+#include "LogGenerator/C2K/Publisher.h"
+
+#include "Tests/LogGenerator/C2K/ParserHarness.h"
+
+#include <gtest/gtest.h>
+
+namespace velmora {
+namespace {
+
+Value target(Value key, Value dict) {
+    return std::make_shared<Dictionary>(Dictionary{{"key", std::move(key)}, {"dict", std::move(dict)}});
+}
+
+class PublisherTest : public testing::Test {
+protected:
+    /// Publishes "new" for "kA" to these targets; what `screen` then shows.
+    std::string publishTo(std::initializer_list<Value> targets) {
+        lookup.set("kA", std::make_shared<Array>(Array(targets)));
+        C2K::Publisher(&lookup).publish("kA", "new");
+        return shown(screen);
+    }
+
+    DictionaryRef screen = makeDictionary();
+    DictionaryRef other = makeDictionary();
+    Dictionary lookup;
+};
+
+TEST_F(PublisherTest, WritesEveryTarget) {
+    EXPECT_EQ(publishTo({target("One", screen), target("Two", other), target("Three", screen)}),
+              "{One 'new', Three 'new'}");
+    EXPECT_EQ(shown(other), "{Two 'new'}");
+}
+
+TEST_F(PublisherTest, AKeyWithoutAnArrayIsNotShown) {
+    C2K::Publisher(nullptr).publish("kA", "new");
+    C2K::Publisher(&lookup).publish("kA", "new");
+    lookup.set("kA", target("One", screen));
+    C2K::Publisher(&lookup).publish("kA", "new");
+    EXPECT_EQ(shown(screen), "{}");
+}
+
+TEST_F(PublisherTest, TheFirstOddTargetEndsIt) {
+    const Value frozen = Value(makeDictionary()).copy();
+    const Value missingDict = std::make_shared<Dictionary>(Dictionary{{"key", "Odd"}});
+    const Value missingKey = std::make_shared<Dictionary>(Dictionary{{"dict", other}});
+    for (const Value& odd :
+         {target("Odd", frozen), target("Odd", "text"), target("Odd", makeArray()), target(7, other),
+          target(makeDictionary(), other), missingDict, missingKey, Value("text"), Value(7)}) {
+        screen = makeDictionary();
+        EXPECT_EQ(publishTo({target("One", screen), odd, target("Two", screen)}), "{One 'new'}")
+            << shown(odd);
+        EXPECT_EQ(shown(other), "{}");
+        EXPECT_EQ(shown(frozen), "{}");
+    }
+}
+
+TEST_F(PublisherTest, AnOddTargetEndsNoOtherKey) {
+    lookup.set("kB", std::make_shared<Array>(Array{target("B", screen)}));
+    publishTo({"text"});
+    C2K::Publisher(&lookup).publish("kB", NumberText("%+.2f dB", 1.0));
+    EXPECT_EQ(shown(screen), "{B '+1.00 dB'}");
+}
+
+} // namespace
+} // namespace velmora
