@@ -21,8 +21,19 @@ enum class Damage : std::uint8_t {
 inline constexpr std::array everyDamage = {Damage::CutShort, Damage::WrongType,    Damage::BelowMinimum,
                                            Damage::Prefixed, Damage::CountOverrun, Damage::UnknownCode};
 
-/// A message of that kind, made from what the phone would report now; none where it has nothing to spoil.
-/// Records of the extra stream are never touched: an unreadable SIM file ends the application.
+/// What a technology gives to be spoilt.
+struct DamageMaterial {
+    RecordBuilder good;                   ///< for what is odd about the framing
+    RecordBuilder belowMinimum;           ///< already shorter than its section's least length
+    std::optional<RecordBuilder> overrun; ///< already with fewer entries than its count promises
+    std::int64_t noise = 0;               ///< what the record of the unknown code holds, 32 bits
+};
+
+/// A message of that kind; none where there is nothing to spoil. Records of the extra stream are never
+/// touched: an unreadable SIM file ends the application.
+[[nodiscard]] std::optional<Data> damagedMessage(Damage damage, const DamageMaterial& material, Time moment);
+
+/// The same made from what the phone of the GSM scenario would report now.
 [[nodiscard]] std::optional<Data> damagedMessage(Damage damage, GSMReportContext& context, Time moment);
 
 } // namespace velmora

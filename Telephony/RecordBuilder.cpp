@@ -32,6 +32,17 @@ RecordBuilder& RecordBuilder::store(std::size_t offset, std::size_t width, std::
     return *this;
 }
 
+RecordBuilder& RecordBuilder::bits(std::size_t byte, unsigned bit, unsigned width, std::int64_t value) {
+    if (const std::size_t end = byte + (bit + width + 7) / 8; end > _bytes.size())
+        _bytes.resize(end);
+    for (unsigned i = 0; i < width; ++i) {
+        const unsigned mask = 1U << (bit + i) % 8;
+        std::uint8_t& at = _bytes[byte + (bit + i) / 8];
+        at = static_cast<std::uint8_t>(value >> i & 1 ? at | mask : at & ~mask);
+    }
+    return *this;
+}
+
 Data RecordBuilder::message(Time moment) const {
     RecordBuilder record = *this;
     record.u16(1, static_cast<std::int64_t>(std::min<std::size_t>(_bytes.size() - 1, 0xFFFF)));

@@ -25,6 +25,10 @@ public:
     RecordBuilder& u8(std::size_t offset, std::int64_t value) { return store(offset, 1, value); }
     RecordBuilder& u16(std::size_t offset, std::int64_t value) { return store(offset, 2, value); }
     RecordBuilder& u32(std::size_t offset, std::int64_t value) { return store(offset, 4, value); }
+    /// Stores `width` bits from bit `bit` (0 to 7, 0 the least significant) of byte `byte` on, as packed
+    /// fields are numbered; a field that runs on into the next byte continues with that byte's bit 0. The
+    /// bytes' other bits stay.
+    RecordBuilder& bits(std::size_t byte, unsigned bit, unsigned width, std::int64_t value);
 
     /// Cuts the record down to `length` bytes, header included; the header always stays whole.
     RecordBuilder& cutTo(std::size_t length);

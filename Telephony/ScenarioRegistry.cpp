@@ -1,6 +1,10 @@
 #include "Telephony/ScenarioRegistry.h"
 
+#include "Telephony/C2KScenario.h"
 #include "Telephony/GSMScenario.h"
+#include "Telephony/IFXScenario.h"
+#include "Telephony/LTEScenario.h"
+#include "Telephony/UTRANScenario.h"
 
 namespace velmora {
 namespace {
@@ -12,6 +16,10 @@ std::unique_ptr<Scenario> make(std::uint64_t seed) {
 
 constexpr ScenarioKind kinds[] = {
     {"gsm", "a drive through GSM and UMTS (Ostrel GSM)", make<GSMScenario>},
+    {"c2k", "a drive through CDMA2000 1x and EV-DO (Ostrel CDMA)", make<C2KScenario>},
+    {"lte", "a drive through LTE (Ostrel LTE)", make<LTEScenario>},
+    {"utran", "a drive through TD-SCDMA (Ostrel UTRAN2)", make<UTRANScenario>},
+    {"ifx", "a drive through GSM told as property lists (IFX)", make<IFXScenario>},
 };
 
 } // namespace

@@ -76,6 +76,27 @@ DictionaryRef umtsCellInformation(const UMTSMeasurement& cell, bool serving) {
     return each;
 }
 
+DictionaryRef utranCellInformation(const UTRANMeasurement& cell, bool serving) {
+    DictionaryRef each = cellCommon(kVoxCellMonitorRadioAccessTechnologyUTRAN, cell.cell.area, serving);
+    each->set(kVoxCellMonitorCellId, cell.cell.cellId);
+    each->set(kVoxCellMonitorUARFCN, cell.cell.uarfcn);
+    each->set(kVoxCellMonitorSCN, cell.cell.parameterId);
+    each->set(kVoxCellMonitorRSCP, cell.rscp_dBm);
+    each->set(kVoxCellMonitorBandInfo, 1); // 1900-1920 and 2010-2025 MHz
+    return each;
+}
+
+DictionaryRef lteCellInformation(const LTEMeasurement& cell, bool serving) {
+    DictionaryRef each = cellCommon(kVoxCellMonitorRadioAccessTechnologyLTE, cell.cell.area, serving);
+    each->remove(kVoxCellMonitorLAC); // it has a tracking area in its place
+    each->set(kVoxCellMonitorTAC, cell.cell.area.lac);
+    each->set(kVoxCellMonitorCellId, cell.cell.identity);
+    each->set(kVoxCellMonitorUARFCN, lteCarriers[cell.cell.carrier].downlink);
+    each->set(kVoxCellMonitorPID, cell.cell.physicalId);
+    each->set(kVoxCellMonitorBandInfo, lteCarriers[cell.cell.carrier].band);
+    return each;
+}
+
 DictionaryRef testSIM(const CellArea& lastArea) {
     return std::make_shared<Dictionary>(Dictionary{
         {"kSimFile_ICCID", "8900101000000000017"},

@@ -1,8 +1,10 @@
 #pragma once
 
 #include "Platform/Value.h"
+#include "Telephony/LTENetwork.h"
 #include "Telephony/RadioNetwork.h"
 #include "Telephony/RecordBuilder.h"
+#include "Telephony/UTRANNetwork.h"
 
 #include <vector>
 
@@ -21,6 +23,8 @@ namespace velmora::records {
 /// Cells as the cell information array describes them.
 [[nodiscard]] DictionaryRef gsmCellInformation(const GSMMeasurement& cell, bool serving);
 [[nodiscard]] DictionaryRef umtsCellInformation(const UMTSMeasurement& cell, bool serving);
+[[nodiscard]] DictionaryRef utranCellInformation(const UTRANMeasurement& cell, bool serving);
+[[nodiscard]] DictionaryRef lteCellInformation(const LTEMeasurement& cell, bool serving);
 
 /// The files of a test SIM of network 001/01 that was last in this area.
 [[nodiscard]] DictionaryRef testSIM(const CellArea& lastArea);
