@@ -2,6 +2,7 @@
 
 #include "Telephony/C2KRecords.h"
 #include "Telephony/DamagedRecords.h"
+#include "Telephony/PeriodicReport.h"
 
 #include <cstdint>
 #include <optional>
@@ -40,12 +41,7 @@ struct C2KReportContext {
     void transferUntil(double at);
 };
 
-/// A record that the modem sends over and over.
-struct C2KReport {
-    double period_s;
-    /// Nothing where the phone's state has nothing to report.
-    std::optional<RecordBuilder> (*make)(C2KReportContext&);
-};
+using C2KReport = PeriodicReport<C2KReportContext>;
 
 /// The reports of the phone's state: some ten messages a second, twenty in a call.
 [[nodiscard]] std::span<const C2KReport> c2kReports();

@@ -2,31 +2,19 @@
 
 #include "Platform/TelephonyService.h"
 
-#include <algorithm>
-#include <cmath>
-#include <iterator>
-
 namespace velmora {
 
 using namespace records;
 
 namespace {
 
-/// A measurement period of the modem.
-constexpr double step_s = 0.48;
-
 constexpr double reselectionMargin_dB = 3;
 constexpr double reselectionTime_s = 2;
 
 } // namespace
 
-/// The round: each phase begins with what the phone does, where it does something, and lasts so long.
-struct C2KScenario::Phase {
-    double duration_s;
-    void (C2KScenario::*begin)();
-};
-
-const C2KScenario::Phase C2KScenario::phases[] = {
+/// The round.
+const DriveScenario::Phase C2KScenario::phases[] = {
     {20, &C2KScenario::powerOn},    // and the session's negotiation
     {30, nullptr},                  // idle on both
     {50, &C2KScenario::connect},    // EV-DO
@@ -39,23 +27,10 @@ const C2KScenario::Phase C2KScenario::phases[] = {
 };
 
 C2KScenario::C2KScenario(std::uint64_t seed)
-    : _network(seed), _random(seed ^ 0xC2C2), _context{_phone, _network, _random} {}
+    : DriveScenario(seed ^ 0xC2C2, phases), _network(seed), _context{_phone, _network, random()} {}
 
 std::string_view C2KScenario::technology() const {
     return kVoxLogChannelTechnology_Ostrel_CDMA;
-}
-
-Time C2KScenario::beginning() {
-    using namespace std::chrono;
-    return sys_days{year{2026} / January / 5} + hours{8};
-}
-
-ScenarioEvent C2KScenario::next() {
-    while (_events.empty())
-        advance();
-    ScenarioEvent event = std::move(_events.front());
-    _events.pop_front();
-    return event;
 }
 
 void C2KScenario::powerOn() {
@@ -78,7 +53,7 @@ void C2KScenario::powerOn() {
     saySession(9, EVDOSession::AMPSetup);
     say(10.2, [this] {
         _phone.session = EVDOSession::ATInitiated;
-        _phone.uati = _random.between(0, 0xFFFFFF);
+        _phone.uati = random().between(0, 0xFFFFFF);
         return evdoStatusReport(_context);
     });
     saySession(11.5, EVDOSession::Initiated);
@@ -142,37 +117,8 @@ void C2KScenario::sayEVDOReturn(double delay) {
     sayEVDO(delay + 2.5, EVDOState::Idle);
 }
 
-void C2KScenario::advance() {
-    _network.drive(step_s);
-    remeasure();
-    followTimeline();
-    reselect();
-
-    const double end = _now + step_s;
-    std::multimap<double, Step> due;
-    const auto later = _script.lower_bound(end);
-    due.insert(_script.begin(), later);
-    _script.erase(_script.begin(), later);
-    addReports(due, end);
-    for (const auto& [at, step] : due) {
-        _context.transferUntil(at);
-        send(at, step());
-    }
-    _now = end;
-    addDamage();
-}
-
-void C2KScenario::followTimeline() {
-    if (_now < _phaseEnd)
-        return;
-    const Phase& phase = phases[_phase];
-    _phase = (_phase + 1) % std::size(phases);
-    _phaseEnd = _now + phase.duration_s;
-    if (phase.begin)
-        (this->*phase.begin)();
-}
-
-void C2KScenario::remeasure() {
+void C2KScenario::drive(double seconds) {
+    _network.drive(seconds);
     if (!_phone.serving)
         return;
     for (const C2KPilot& pilot : _network.pilots())
@@ -185,52 +131,22 @@ void C2KScenario::remeasure() {
     _phone.serving = C2KPilot{_phone.serving->sector};
 }
 
-void C2KScenario::reselect() {
+void C2KScenario::react() {
     const bool better =
         _phone.serving && !_network.pilots().empty() &&
         _network.pilots().front().level_dBm >= _phone.serving->level_dBm + reselectionMargin_dB;
-    if (!better) {
-        _betterSince = _now;
-    } else if (_now - _betterSince >= reselectionTime_s) {
-        _betterSince = _now;
+    if (timeToReselect(better, reselectionTime_s)) {
         _phone.serving = _network.pilots().front();
         say(0.1, [this] { return systemReport(_context); });
     }
 }
 
-void C2KScenario::addReports(std::multimap<double, Step>& due, double end) {
-    double phase = 0; // keeps reports of one period apart
-    for (const C2KReport& report : c2kReports()) {
-        phase += 0.037;
-        double turn = std::max(std::ceil((_now - phase) / report.period_s), 0.0);
-        for (; turn * report.period_s + phase < end; ++turn)
-            due.emplace(turn * report.period_s + phase, [this, &report] { return report.make(_context); });
-    }
+void C2KScenario::addReports(DriveScript& due) {
+    schedule(c2kReports(), _context, 0.037, due);
 }
 
-void C2KScenario::addDamage() {
-    if (_now < _nextDamage)
-        return;
-    _nextDamage = _now + 5 + 10 * _random.unit();
-    const Damage damage = everyDamage[_damage % everyDamage.size()];
-    const DamageMaterial material = c2kDamageMaterial(_context, _damage / everyDamage.size());
-    ++_damage;
-    const auto offset = offsetOf(_now);
-    if (const auto message = damagedMessage(damage, material, beginning() + offset))
-        _events.push_back({offset, *message});
-}
-
-void C2KScenario::send(double at, const std::optional<RecordBuilder>& record) {
-    if (!record)
-        return;
-    const auto offset = offsetOf(at);
-    _events.push_back({offset, record->message(beginning() + offset)});
-}
-
-std::chrono::nanoseconds C2KScenario::offsetOf(double at) {
-    // A moment that two steps reckon in different ways may come out a nanosecond apart.
-    _lastOffset = std::max(_lastOffset, std::chrono::nanoseconds(std::llround(at * 1e9)));
-    return _lastOffset;
+DamageMaterial C2KScenario::damageMaterial(std::size_t number) {
+    return c2kDamageMaterial(_context, number / everyDamage.size());
 }
 
 } // namespace velmora

@@ -38,17 +38,4 @@ std::optional<Data> damagedMessage(Damage damage, const DamageMaterial& material
     return std::nullopt;
 }
 
-std::optional<Data> damagedMessage(Damage damage, GSMReportContext& context, Time moment) {
-    DamageMaterial material{
-        *registrationReport(context),
-        records::servingNetwork(0, records::ServiceType::CSAndPS, context.phone.area()).cutTo(31),
-        gsmMeasurementReport(context)};
-    // The count of a measurement record says two more than there are.
-    if (material.overrun)
-        material.overrun->u8(28, static_cast<std::int64_t>((material.overrun->size() - 29) / 14) + 2);
-    if (damage == Damage::UnknownCode)
-        material.noise = context.random.between(0, 1 << 20);
-    return damagedMessage(damage, material, moment);
-}
-
 } // namespace velmora

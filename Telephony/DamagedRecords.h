@@ -1,7 +1,7 @@
 #pragma once
 
 #include "Platform/Bytes.h"
-#include "Telephony/GSMReports.h"
+#include "Telephony/RecordBuilder.h"
 
 #include <array>
 #include <cstdint>
@@ -32,8 +32,5 @@ struct DamageMaterial {
 /// A message of that kind; none where there is nothing to spoil. Records of the extra stream are never
 /// touched: an unreadable SIM file ends the application.
 [[nodiscard]] std::optional<Data> damagedMessage(Damage damage, const DamageMaterial& material, Time moment);
-
-/// The same made from what the phone of the GSM scenario would report now.
-[[nodiscard]] std::optional<Data> damagedMessage(Damage damage, GSMReportContext& context, Time moment);
 
 } // namespace velmora

@@ -14,13 +14,6 @@ constexpr int networkOperatingMode = 0; ///< class 1: paging is coordinated
 
 } // namespace
 
-std::multimap<double, GSMProcedures::Step> GSMProcedures::takeUntil(double end) {
-    std::multimap<double, Step> due;
-    while (!_script.empty() && _script.begin()->first < end)
-        due.insert(due.end(), _script.extract(_script.begin()));
-    return due;
-}
-
 void GSMProcedures::sayRegistration(double at, RegistrationState state) {
     say(at, [this, state] {
         _phone.registration = state;

@@ -1,11 +1,9 @@
 #pragma once
 
+#include "Telephony/DriveScript.h"
 #include "Telephony/GSMPhone.h"
-#include "Telephony/RecordBuilder.h"
 
-#include <functional>
-#include <map>
-#include <optional>
+#include <utility>
 
 namespace velmora {
 
@@ -14,11 +12,9 @@ namespace velmora {
 /// A step changes the phone and gives the record that tells of it.
 class GSMProcedures {
 public:
-    /// Gives the record, or nothing where there is none to send.
-    using Step = std::function<std::optional<RecordBuilder>()>;
-
-    /// Both must outlive this.
-    GSMProcedures(GSMPhone& phone, const RadioNetwork& network) : _phone(phone), _network(network) {}
+    /// All three must outlive this.
+    GSMProcedures(GSMPhone& phone, const RadioNetwork& network, DriveScript& script)
+        : _phone(phone), _network(network), _script(script) {}
 
     /// Each begins at `now`, in seconds from the scenario's start.
     void powerOn(double now);        ///< 9 s: network search, up to camping on GSM
@@ -35,14 +31,8 @@ public:
     void reselectWithinUMTS(double now, const UMTSMeasurement& better);
     void powerOff(double now); ///< 4 s: detach and off
 
-    /// Whether no procedure is running.
-    [[nodiscard]] bool idle() const { return _script.empty(); }
-    /// Takes the steps that come before `end` out of the script, by time; steps of one time in the order in
-    /// which they were put there.
-    [[nodiscard]] std::multimap<double, Step> takeUntil(double end);
-
 private:
-    void say(double at, Step step) { _script.emplace(at, std::move(step)); }
+    void say(double at, DriveStep step) { _script.emplace(at, std::move(step)); }
     void sayRegistration(double at, records::RegistrationState state);
     void sayMM(double at, records::MMState state, records::MMSubState subState);
     void sayGMM(double at, records::GMMState state, records::GMMSubState subState);
@@ -60,7 +50,7 @@ private:
 
     GSMPhone& _phone;
     const RadioNetwork& _network;
-    std::multimap<double, Step> _script;
+    DriveScript& _script;
     bool _binary = false; ///< the form of the next context list; the two alternate
 };
 

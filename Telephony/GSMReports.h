@@ -1,7 +1,7 @@
 #pragma once
 
 #include "Telephony/GSMPhone.h"
-#include "Telephony/RecordBuilder.h"
+#include "Telephony/PeriodicReport.h"
 
 #include <cstdint>
 #include <optional>
@@ -20,12 +20,7 @@ struct GSMReportContext {
     int subFrames = 0;          ///< HSDPA sub-frames so far, modulo 1024
 };
 
-/// A record that the modem sends over and over.
-struct GSMReport {
-    double period_s;
-    /// Nothing where the phone's state has nothing to report.
-    std::optional<RecordBuilder> (*make)(GSMReportContext&);
-};
+using GSMReport = PeriodicReport<GSMReportContext>;
 
 /// The reports of the phone's state: some twenty messages a second.
 [[nodiscard]] std::span<const GSMReport> reportsOf(const GSMPhone& phone);

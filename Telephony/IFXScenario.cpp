@@ -2,6 +2,7 @@
 
 #include "Platform/PropertyList.h"
 #include "Platform/TelephonyService.h"
+#include "Telephony/ServingMeasurement.h"
 
 #include <algorithm>
 #include <iterator>
@@ -80,12 +81,8 @@ void IFXScenario::camp() {
         return;
     }
     const auto& cells = _network.gsm();
-    if (_phone.serving) {
-        const auto found = std::find_if(cells.begin(), cells.end(), [this](const GSMMeasurement& each) {
-            return each.cell == _phone.serving->cell;
-        });
-        _phone.serving->rssi_dBm = found != cells.end() ? found->rssi_dBm : GSMMeasurement{}.rssi_dBm;
-    }
+    if (_phone.serving)
+        _phone.serving = measuredAnew(*_phone.serving, cells);
     if (!cells.empty() &&
         (!_phone.serving || cells.front().rssi_dBm >= _phone.serving->rssi_dBm + reselectionMargin_dB))
         _phone.serving = cells.front();

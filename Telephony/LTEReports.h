@@ -1,6 +1,7 @@
 #pragma once
 
 #include "Telephony/LTERecords.h"
+#include "Telephony/PeriodicReport.h"
 
 #include <cstddef>
 #include <cstdint>
@@ -34,12 +35,7 @@ struct LTEReportContext {
     int subframe = 0;           ///< of 1024 frames of ten
 };
 
-/// A record that the modem sends over and over.
-struct LTEReport {
-    double period_s;
-    /// Nothing where the phone's state has nothing to report.
-    std::optional<RecordBuilder> (*make)(LTEReportContext&);
-};
+using LTEReport = PeriodicReport<LTEReportContext>;
 
 /// The reports of the phone's state: some six to eight messages a second.
 [[nodiscard]] std::span<const LTEReport> reportsOf(const LTEPhone& phone);

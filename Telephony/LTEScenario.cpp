@@ -1,17 +1,13 @@
 #include "Telephony/LTEScenario.h"
 
 #include "Platform/TelephonyService.h"
+#include "Telephony/ServingMeasurement.h"
 
 #include <algorithm>
-#include <cmath>
-#include <iterator>
 
 namespace velmora {
 
 namespace {
-
-/// A measurement period of the modem.
-constexpr double step_s = 0.48;
 
 constexpr double reselectionMargin_dB = 4;
 constexpr double reselectionTime_s = 2;
@@ -21,14 +17,8 @@ constexpr double averaging = 0.3;
 
 } // namespace
 
-/// The round: each phase begins with a procedure, where it has one, and lasts so long, or longer while the
-/// script is not at its end.
-struct LTEScenario::Phase {
-    double duration_s;
-    void (LTEScenario::*begin)();
-};
-
-const LTEScenario::Phase LTEScenario::phases[] = {
+/// The round.
+const DriveScenario::Phase LTEScenario::phases[] = {
     {5, &LTEScenario::powerOn},
     {5, &LTEScenario::registerWithNetwork},
     {18, nullptr}, // idle
@@ -49,23 +39,10 @@ const LTEScenario::Phase LTEScenario::phases[] = {
 };
 
 LTEScenario::LTEScenario(std::uint64_t seed)
-    : _network(seed), _random(seed ^ 0x5EED), _context{_phone, _network, _random} {}
+    : DriveScenario(seed ^ 0x5EED, phases), _network(seed), _context{_phone, _network, random()} {}
 
 std::string_view LTEScenario::technology() const {
     return kVoxLogChannelTechnology_Ostrel_LTE;
-}
-
-Time LTEScenario::beginning() {
-    using namespace std::chrono;
-    return sys_days{year{2026} / January / 5} + hours{8};
-}
-
-ScenarioEvent LTEScenario::next() {
-    while (_events.empty())
-        advance();
-    ScenarioEvent event = std::move(_events.front());
-    _events.pop_front();
-    return event;
 }
 
 std::optional<RecordBuilder> LTEScenario::camp() {
@@ -116,7 +93,7 @@ void LTEScenario::registerWithNetwork() {
 
 void LTEScenario::startSession() {
     sayConnected(0.2, true);
-    sayContexts(1.0, _random.chance(0.5) ? 2 : 1);
+    sayContexts(1.0, random().chance(0.5) ? 2 : 1);
 }
 
 void LTEScenario::endSession() {
@@ -140,7 +117,7 @@ void LTEScenario::connectBriefly() {
 
 void LTEScenario::updateArea() {
     const bool registered = _phone.contexts > 0;
-    if (!registered || !_phone.serving || !_script.empty() ||
+    if (!registered || !_phone.serving || !script().empty() ||
         _phone.serving->cell.area == _phone.registeredArea)
         return;
     if (!_phone.connected) {
@@ -164,75 +141,33 @@ void LTEScenario::powerOff() {
     });
 }
 
-void LTEScenario::advance() {
-    _network.drive(step_s);
-    remeasure();
-    followTimeline();
-    reselect();
-    updateArea();
-
-    const double end = _now + step_s;
-    std::multimap<double, Step> due;
-    while (!_script.empty() && _script.begin()->first < end)
-        due.insert(due.end(), _script.extract(_script.begin()));
-    addReports(due, end);
-    for (const auto& [at, step] : due)
-        send(at, step());
-    _now = end;
-    addDamage();
-}
-
-void LTEScenario::followTimeline() {
-    if (_now < _phaseEnd || !_script.empty())
-        return;
-    const Phase& phase = phases[_phase];
-    _phase = (_phase + 1) % std::size(phases);
-    _phaseEnd = _now + phase.duration_s;
-    if (phase.begin)
-        (this->*phase.begin)();
-}
-
-void LTEScenario::remeasure() {
+void LTEScenario::drive(double seconds) {
+    _network.drive(seconds);
     if (!_phone.serving)
         return;
-    const auto& cells = _network.cells(_phone.carrier);
-    const auto found = std::find_if(cells.begin(), cells.end(), [this](const LTEMeasurement& each) {
-        return each.cell == _phone.serving->cell;
-    });
-    LTEMeasurement lost; // at the receiver's limit where it is not measured
-    lost.cell = _phone.serving->cell;
-    _phone.serving = found != cells.end() ? *found : lost;
+    _phone.serving = measuredAnew(*_phone.serving, _network.cells(_phone.carrier));
     _phone.average.rsrp_dBm += averaging * (_phone.serving->rsrp_dBm - _phone.average.rsrp_dBm);
     _phone.average.rsrq_dB += averaging * (_phone.serving->rsrq_dB - _phone.average.rsrq_dB);
     _phone.cyclesBelow =
         records::selectionLevel_dB(*_phone.serving) < 0 ? std::min(_phone.cyclesBelow + 1, 63) : 0;
 }
 
-void LTEScenario::reselect() {
+void LTEScenario::react() {
     const auto& cells = _network.cells(_phone.carrier);
     const bool better = _phone.serving && !cells.empty() &&
                         cells.front().rsrp_dBm >= _phone.serving->rsrp_dBm + reselectionMargin_dB;
-    if (!better) {
-        _betterSince = _now;
-    } else if (_now - _betterSince >= reselectionTime_s) {
-        _betterSince = _now;
+    if (timeToReselect(better, reselectionTime_s))
         say(0, [this] { return camp(); });
-    }
+    updateArea();
 }
 
-void LTEScenario::addReports(std::multimap<double, Step>& due, double end) {
-    double phase = 0; // keeps reports of one period apart
-    for (const LTEReport& report : reportsOf(_phone)) {
-        phase += 0.137;
-        double turn = std::ceil((_now - phase) / report.period_s);
-        for (; turn * report.period_s + phase < end; ++turn)
-            due.emplace(turn * report.period_s + phase, [this, &report] { return report.make(_context); });
-    }
+void LTEScenario::addReports(DriveScript& due) {
+    schedule(reportsOf(_phone), _context, 0.137, due);
 }
 
-DamageMaterial LTEScenario::damageMaterial() {
+DamageMaterial LTEScenario::damageMaterial(std::size_t number) {
     // Which records are spoilt changes from round to round of the kinds of damage.
-    const std::size_t round = _damage / everyDamage.size();
+    const std::size_t round = number / everyDamage.size();
     const LTEMeasurement serving = _phone.serving.value_or(LTEMeasurement{});
     RecordBuilder tooShort = records::lteServingCell(serving.cell);
     switch (round % 5) {
@@ -259,32 +194,7 @@ DamageMaterial LTEScenario::damageMaterial() {
         overrun->u16(19, 3).cutTo(29);
         break;
     }
-    return {records::lteServingCell(serving.cell), tooShort, overrun, static_cast<std::int64_t>(_damage)};
-}
-
-void LTEScenario::addDamage() {
-    if (_now < _nextDamage)
-        return;
-    _nextDamage = _now + 5 + 10 * _random.unit();
-    const Damage damage = everyDamage[_damage % everyDamage.size()];
-    const DamageMaterial material = damageMaterial();
-    ++_damage;
-    const auto offset = offsetOf(_now);
-    if (const auto message = damagedMessage(damage, material, beginning() + offset))
-        _events.push_back({offset, *message});
-}
-
-void LTEScenario::send(double at, const std::optional<RecordBuilder>& record) {
-    if (!record)
-        return;
-    const auto offset = offsetOf(at);
-    _events.push_back({offset, record->message(beginning() + offset)});
-}
-
-std::chrono::nanoseconds LTEScenario::offsetOf(double at) {
-    // A moment that two steps reckon in different ways may come out a nanosecond apart.
-    _lastOffset = std::max(_lastOffset, std::chrono::nanoseconds(std::llround(at * 1e9)));
-    return _lastOffset;
+    return {records::lteServingCell(serving.cell), tooShort, overrun, static_cast<std::int64_t>(number)};
 }
 
 } // namespace velmora

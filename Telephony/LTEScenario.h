@@ -1,13 +1,7 @@
 #pragma once
 
-#include "Telephony/DamagedRecords.h"
+#include "Telephony/DriveScenario.h"
 #include "Telephony/LTEReports.h"
-#include "Telephony/Scenario.h"
-
-#include <cstddef>
-#include <deque>
-#include <functional>
-#include <map>
 
 namespace velmora {
 
@@ -34,29 +28,16 @@ namespace velmora {
 /// contexts, as binary and XML property lists in turn. Every ten seconds or so a message is odd (see Damage):
 /// the records of serving cell, idle and connected measurement, neighbours and candidates come too short by
 /// turns, and each of the three counted ones with a count too high.
-///
-/// All comes of the seed: the same seed gives the same bytes. Records are stamped as if the drive had begun
-/// on 2026-01-05 at 08:00 UTC. Main thread only.
-class LTEScenario final : public Scenario {
+/// Main thread only.
+class LTEScenario final : public DriveScenario {
 public:
     explicit LTEScenario(std::uint64_t seed);
-    // The reports point into the scenario.
-    LTEScenario(const LTEScenario&) = delete;
-    LTEScenario& operator=(const LTEScenario&) = delete;
-
     [[nodiscard]] std::string_view technology() const override;
-    [[nodiscard]] ScenarioEvent next() override;
-
-    /// When the drive begins by the records' time stamps.
-    [[nodiscard]] static Time beginning();
 
 private:
-    /// Changes the phone and gives the record that tells of it, or nothing where there is none to send.
-    using Step = std::function<std::optional<RecordBuilder>()>;
-    struct Phase;
     static const Phase phases[];
 
-    /// What the phone goes through; each puts its steps on the script, from `_now` on.
+    /// What the phone goes through; each puts its steps on the script, from now on.
     void powerOn();
     void registerWithNetwork();
     void startSession();
@@ -68,39 +49,19 @@ private:
     void updateArea();
     void powerOff();
 
-    /// Fills `_events` with what the next 0.48 s bring; that may be nothing.
-    void advance();
-    void followTimeline();
-    void remeasure();
-    void reselect();
-    void addReports(std::multimap<double, Step>& due, double end);
-    void addDamage();
-    [[nodiscard]] DamageMaterial damageMaterial();
+    void drive(double seconds) override;
+    void react() override;
+    void addReports(DriveScript& due) override;
+    [[nodiscard]] DamageMaterial damageMaterial(std::size_t number) override;
 
     /// Camps on the best cell of the phone's carrier, where there is one, and tells of it.
     std::optional<RecordBuilder> camp();
-    /// A step so many seconds from now.
-    void say(double delay, Step step) { _script.emplace(_now + delay, std::move(step)); }
     void sayConnected(double delay, bool connected);
     void sayContexts(double delay, int count);
-    void send(double at, const std::optional<RecordBuilder>& record);
-    /// The offset of that second; never before the last one given.
-    [[nodiscard]] std::chrono::nanoseconds offsetOf(double at);
 
     LTENetwork _network;
-    ScenarioRandom _random;
     LTEPhone _phone;
     LTEReportContext _context;
-    std::multimap<double, Step> _script;
-
-    double _now = 0; ///< seconds from the start
-    std::size_t _phase = 0;
-    double _phaseEnd = 0;
-    double _betterSince = 0; ///< since when some neighbour has been better than the serving cell
-    double _nextDamage = 5;
-    std::size_t _damage = 0; ///< how many messages have been odd
-    std::chrono::nanoseconds _lastOffset{0};
-    std::deque<ScenarioEvent> _events;
 };
 
 } // namespace velmora

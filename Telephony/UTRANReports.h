@@ -1,6 +1,6 @@
 #pragma once
 
-#include "Telephony/RecordBuilder.h"
+#include "Telephony/PeriodicReport.h"
 #include "Telephony/UTRANRecords.h"
 
 #include <cstdint>
@@ -35,12 +35,7 @@ struct UTRANReportContext {
     bool binary = false; ///< the form of the next property list; reports turn it over
 };
 
-/// A record that the modem sends over and over.
-struct UTRANReport {
-    double period_s;
-    /// Nothing where the phone's state has nothing to report.
-    std::optional<RecordBuilder> (*make)(UTRANReportContext&);
-};
+using UTRANReport = PeriodicReport<UTRANReportContext>;
 
 /// The reports of the phone's state: some ten messages a second.
 [[nodiscard]] std::span<const UTRANReport> reportsOf(const UTRANPhone& phone);

@@ -1,10 +1,9 @@
 #include "Telephony/UTRANScenario.h"
 
 #include "Platform/TelephonyService.h"
+#include "Telephony/ServingMeasurement.h"
 
 #include <algorithm>
-#include <cmath>
-#include <iterator>
 
 namespace velmora {
 
@@ -12,22 +11,13 @@ using records::RRCState;
 
 namespace {
 
-/// A measurement period of the modem.
-constexpr double step_s = 0.48;
-
 constexpr int reselectionMargin_dB = 5;
 constexpr double reselectionTime_s = 3;
 
 } // namespace
 
-/// The round: each phase begins with a procedure, where it has one, and lasts so long, or longer while the
-/// script is not at its end.
-struct UTRANScenario::Phase {
-    double duration_s;
-    void (UTRANScenario::*begin)();
-};
-
-const UTRANScenario::Phase UTRANScenario::phases[] = {
+/// The round.
+const DriveScenario::Phase UTRANScenario::phases[] = {
     {8, &UTRANScenario::powerOn},
     {6, &UTRANScenario::registerWithNetwork},
     {25, nullptr}, // idle
@@ -42,23 +32,10 @@ const UTRANScenario::Phase UTRANScenario::phases[] = {
 };
 
 UTRANScenario::UTRANScenario(std::uint64_t seed)
-    : _network(seed), _random(seed ^ 0x5EED), _context{_phone, _network, _random} {}
+    : DriveScenario(seed ^ 0x5EED, phases), _network(seed), _context{_phone, _network, random()} {}
 
 std::string_view UTRANScenario::technology() const {
     return kVoxLogChannelTechnology_Ostrel_UTRAN2;
-}
-
-Time UTRANScenario::beginning() {
-    using namespace std::chrono;
-    return sys_days{year{2026} / January / 5} + hours{8};
-}
-
-ScenarioEvent UTRANScenario::next() {
-    while (_events.empty())
-        advance();
-    ScenarioEvent event = std::move(_events.front());
-    _events.pop_front();
-    return event;
 }
 
 void UTRANScenario::sayRRC(double delay, RRCState state) {
@@ -155,75 +132,34 @@ void UTRANScenario::powerOff() {
     say(2.3, [] { return records::utranGSMNeighbours({}); });
 }
 
-void UTRANScenario::advance() {
-    _network.drive(step_s);
-    remeasure();
-    followTimeline();
-    reselect();
-
-    const double end = _now + step_s;
-    std::multimap<double, Step> due;
-    while (!_script.empty() && _script.begin()->first < end)
-        due.insert(due.end(), _script.extract(_script.begin()));
-    addReports(due, end);
-    for (const auto& [at, step] : due)
-        send(at, step());
-    _now = end;
-    addDamage();
+void UTRANScenario::drive(double seconds) {
+    _network.drive(seconds);
+    if (_phone.serving)
+        _phone.serving = measuredAnew(*_phone.serving, _network.cells());
 }
 
-void UTRANScenario::followTimeline() {
-    if (_now < _phaseEnd || !_script.empty())
-        return;
-    const Phase& phase = phases[_phase];
-    _phase = (_phase + 1) % std::size(phases);
-    _phaseEnd = _now + phase.duration_s;
-    if (phase.begin)
-        (this->*phase.begin)();
-}
-
-void UTRANScenario::remeasure() {
-    if (!_phone.serving)
-        return;
-    const auto found =
-        std::find_if(_network.cells().begin(), _network.cells().end(),
-                     [this](const UTRANMeasurement& each) { return each.cell == _phone.serving->cell; });
-    // At the receiver's limit where it is not measured.
-    _phone.serving->rscp_dBm =
-        found != _network.cells().end() ? found->rscp_dBm : UTRANMeasurement{}.rscp_dBm;
-}
-
-void UTRANScenario::reselect() {
+void UTRANScenario::react() {
     const auto& cells = _network.cells();
     const bool better = _phone.serving && !cells.empty() &&
                         cells.front().rscp_dBm >= _phone.serving->rscp_dBm + reselectionMargin_dB;
-    if (!better) {
-        _betterSince = _now;
-    } else if (_now - _betterSince >= reselectionTime_s) {
-        _betterSince = _now;
+    if (timeToReselect(better, reselectionTime_s)) {
         _phone.serving = cells.front();
         say(0, [this] { return utranReports::serving(_context); });
         return;
     }
     // Idle in an area that the network does not know the phone to be in, it registers anew.
-    if (_script.empty() && _phone.registered && _phone.rrc == RRCState::Disconnected && _phone.serving &&
+    if (script().empty() && _phone.registered && _phone.rrc == RRCState::Disconnected && _phone.serving &&
         _phone.serving->cell.area != _phone.registeredArea)
         registerWithNetwork();
 }
 
-void UTRANScenario::addReports(std::multimap<double, Step>& due, double end) {
-    double phase = 0; // keeps reports of one period apart
-    for (const UTRANReport& report : reportsOf(_phone)) {
-        phase += 0.137;
-        double turn = std::ceil((_now - phase) / report.period_s);
-        for (; turn * report.period_s + phase < end; ++turn)
-            due.emplace(turn * report.period_s + phase, [this, &report] { return report.make(_context); });
-    }
+void UTRANScenario::addReports(DriveScript& due) {
+    schedule(reportsOf(_phone), _context, 0.137, due);
 }
 
-DamageMaterial UTRANScenario::damageMaterial() {
+DamageMaterial UTRANScenario::damageMaterial(std::size_t number) {
     // Which records are spoilt changes from round to round of the kinds of damage.
-    const std::size_t round = _damage / everyDamage.size();
+    const std::size_t round = number / everyDamage.size();
     RecordBuilder tooShort =
         round % 2 == 0 ? records::utranServingCell(_phone.serving ? _phone.serving->cell : UTRANCell{}, false)
                        : records::utranRRCState(_phone.rrc);
@@ -245,32 +181,7 @@ DamageMaterial UTRANScenario::damageMaterial() {
         overrun->cutTo(19);
         break;
     }
-    return {*utranReports::rrc(_context), tooShort, overrun, static_cast<std::int64_t>(_damage)};
-}
-
-void UTRANScenario::addDamage() {
-    if (_now < _nextDamage)
-        return;
-    _nextDamage = _now + 5 + 10 * _random.unit();
-    const Damage damage = everyDamage[_damage % everyDamage.size()];
-    const DamageMaterial material = damageMaterial();
-    ++_damage;
-    const auto offset = offsetOf(_now);
-    if (const auto message = damagedMessage(damage, material, beginning() + offset))
-        _events.push_back({offset, *message});
-}
-
-void UTRANScenario::send(double at, const std::optional<RecordBuilder>& record) {
-    if (!record)
-        return;
-    const auto offset = offsetOf(at);
-    _events.push_back({offset, record->message(beginning() + offset)});
-}
-
-std::chrono::nanoseconds UTRANScenario::offsetOf(double at) {
-    // A moment that two steps reckon in different ways may come out a nanosecond apart.
-    _lastOffset = std::max(_lastOffset, std::chrono::nanoseconds(std::llround(at * 1e9)));
-    return _lastOffset;
+    return {*utranReports::rrc(_context), tooShort, overrun, static_cast<std::int64_t>(number)};
 }
 
 } // namespace velmora

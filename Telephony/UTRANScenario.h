@@ -1,13 +1,7 @@
 #pragma once
 
-#include "Telephony/DamagedRecords.h"
-#include "Telephony/Scenario.h"
+#include "Telephony/DriveScenario.h"
 #include "Telephony/UTRANReports.h"
-
-#include <cstddef>
-#include <deque>
-#include <functional>
-#include <map>
 
 namespace velmora {
 
@@ -30,29 +24,16 @@ namespace velmora {
 /// binary and XML property lists in turn. Every ten seconds or so a message is odd (see Damage): the records
 /// of the RRC state and of the serving cell come too short by turns - after the former the state is unknown
 /// until the next report - and each of the three counted records comes with a count too high.
-///
-/// All comes of the seed: the same seed gives the same bytes. Records are stamped as if the drive had begun
-/// on 2026-01-05 at 08:00 UTC. Main thread only.
-class UTRANScenario final : public Scenario {
+/// Main thread only.
+class UTRANScenario final : public DriveScenario {
 public:
     explicit UTRANScenario(std::uint64_t seed);
-    // The reports point into the scenario.
-    UTRANScenario(const UTRANScenario&) = delete;
-    UTRANScenario& operator=(const UTRANScenario&) = delete;
-
     [[nodiscard]] std::string_view technology() const override;
-    [[nodiscard]] ScenarioEvent next() override;
-
-    /// When the drive begins by the records' time stamps.
-    [[nodiscard]] static Time beginning();
 
 private:
-    /// Changes the phone and gives the record that tells of it, or nothing where there is none to send.
-    using Step = std::function<std::optional<RecordBuilder>()>;
-    struct Phase;
     static const Phase phases[];
 
-    /// What the phone goes through; each puts its steps on the script, from `_now` on.
+    /// What the phone goes through; each puts its steps on the script, from now on.
     void powerOn();
     void registerWithNetwork();
     void startSession();
@@ -61,38 +42,18 @@ private:
     void endCall();
     void powerOff();
 
-    /// Fills `_events` with what the next 0.48 s bring; that may be nothing.
-    void advance();
-    void followTimeline();
-    void remeasure();
-    void reselect();
-    void addReports(std::multimap<double, Step>& due, double end);
-    void addDamage();
-    [[nodiscard]] DamageMaterial damageMaterial();
+    void drive(double seconds) override;
+    void react() override;
+    void addReports(DriveScript& due) override;
+    [[nodiscard]] DamageMaterial damageMaterial(std::size_t number) override;
 
-    /// A step so many seconds from now.
-    void say(double delay, Step step) { _script.emplace(_now + delay, std::move(step)); }
     void sayRRC(double delay, records::RRCState state);
     void sayContexts(double delay, int count);
-    void send(double at, const std::optional<RecordBuilder>& record);
-    /// The offset of that second; never before the last one given.
-    [[nodiscard]] std::chrono::nanoseconds offsetOf(double at);
 
     UTRANNetwork _network;
-    ScenarioRandom _random;
     UTRANPhone _phone;
     UTRANReportContext _context;
-    std::multimap<double, Step> _script;
-
-    double _now = 0; ///< seconds from the start
-    std::size_t _phase = 0;
-    double _phaseEnd = 0;
-    int _sessions = 0;       ///< packet sessions so far
-    double _betterSince = 0; ///< since when some neighbour has been better than the serving cell
-    double _nextDamage = 5;
-    std::size_t _damage = 0; ///< how many messages have been odd
-    std::chrono::nanoseconds _lastOffset{0};
-    std::deque<ScenarioEvent> _events;
+    int _sessions = 0; ///< packet sessions so far
 };
 
 } // namespace velmora

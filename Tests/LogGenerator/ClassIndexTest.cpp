@@ -3,13 +3,11 @@
 #include "LogGenerator/OstrelGSM/ProcessCS.h"
 #include "LogGenerator/PDPContextList.h"
 #include "LogGenerator/SimInfo.h"
-#include "Platform/Console.h"
-#include "Tests/Support/CapturedLog.h"
+#include "Tests/LogGenerator/ClassIndexTesting.h"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
-#include <cstdio>
 #include <memory>
 #include <string>
 
@@ -59,16 +57,7 @@ TEST(ClassIndexTest, StatusSaysWhatTheClassDictionaryIs) {
 }
 
 TEST(ClassIndexTest, DestructionPrintsItsLineOnTheConsole) {
-    std::FILE* console = std::tmpfile();
-    ASSERT_NE(console, nullptr);
-    std::FILE* const earlier = redirectConsole(console);
-    { const SmallIndex index; }
-    redirectConsole(earlier);
-    std::rewind(console);
-    char line[64] = {};
-    const std::size_t length = std::fread(line, 1, sizeof line - 1, console);
-    std::fclose(console);
-    EXPECT_EQ(std::string(line, length), "Deallocing ClassIndex\n");
+    EXPECT_EQ(printedBy([] { const SmallIndex index; }), "Deallocing ClassIndex\n");
 }
 
 } // namespace

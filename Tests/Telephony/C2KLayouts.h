@@ -2,42 +2,21 @@
 
 #include "Recording/RecordHeader.h"
 #include "Telephony/C2KScenario.h"
+#include "Tests/Telephony/ScenarioTesting.h"
 
 #include <chrono>
 #include <cstdint>
 #include <functional>
 #include <map>
-#include <vector>
 
 /// What the tests of the CDMA2000 scenario share: its messages, and the layouts of its records.
 
 namespace velmora::c2k {
 
-/// All messages of the first `duration`.
-inline std::vector<ScenarioEvent> drive(std::uint64_t seed, std::chrono::nanoseconds duration) {
-    C2KScenario scenario(seed);
-    std::vector<ScenarioEvent> events;
-    for (ScenarioEvent event = scenario.next(); event.offset < duration; event = scenario.next())
-        events.push_back(std::move(event));
-    return events;
-}
-
 /// Twenty minutes of seed 1: five rounds.
-inline const std::vector<ScenarioEvent>& twentyMinutes() {
-    static const std::vector<ScenarioEvent> events = drive(1, std::chrono::minutes(20));
-    return events;
-}
-
-inline unsigned u16(Bytes record, std::size_t offset) {
-    return record[offset] | static_cast<unsigned>(record[offset + 1]) << 8;
-}
-
-inline std::int64_t u32(Bytes record, std::size_t offset) {
-    return u16(record, offset) | static_cast<std::int64_t>(u16(record, offset + 2)) << 16;
-}
-
-inline int s8(Bytes record, std::size_t offset) {
-    return static_cast<std::int8_t>(record[offset]);
+inline const Drive& twentyMinutes() {
+    static const Drive drive = driveOf<C2KScenario>(1, std::chrono::minutes(20));
+    return drive;
 }
 
 /// Where each sub-packet begins, by its id; empty where they do not fill the record just so.

@@ -1,15 +1,12 @@
 #include "Telephony/GSMScenario.h"
 
-#include "Platform/PropertyList.h"
 #include "Platform/TelephonyService.h"
-#include "Recording/RecordHeader.h"
-#include "Recording/RecordTime.h"
+#include "Tests/Telephony/ScenarioTesting.h"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
 #include <algorithm>
-#include <functional>
 #include <map>
 #include <set>
 #include <vector>
@@ -19,49 +16,13 @@ namespace {
 
 using namespace std::chrono_literals;
 
-/// All messages of the first `duration`.
-std::vector<ScenarioEvent> drive(std::uint64_t seed, std::chrono::nanoseconds duration) {
-    GSMScenario scenario(seed);
-    std::vector<ScenarioEvent> events;
-    for (ScenarioEvent event = scenario.next(); event.offset < duration; event = scenario.next())
-        events.push_back(std::move(event));
-    return events;
-}
-
 /// Ten minutes of seed 1: a whole round and most of the next.
-const std::vector<ScenarioEvent>& tenMinutes() {
-    static const std::vector<ScenarioEvent> events = drive(1, 10min);
-    return events;
+const Drive& tenMinutes() {
+    static const Drive drive = driveOf<GSMScenario>(1, 10min);
+    return drive;
 }
 
-unsigned u16(Bytes record, std::size_t offset) {
-    return record[offset] | static_cast<unsigned>(record[offset + 1]) << 8;
-}
-
-int s8(Bytes record, std::size_t offset) {
-    return static_cast<std::int8_t>(record[offset]);
-}
-
-/// Calls `look` with every record of that code that is as its table says.
-void eachRecord(std::uint32_t code, std::size_t minimum, const std::function<void(Bytes)>& look) {
-    int seen = 0;
-    for (const ScenarioEvent& event : tenMinutes()) {
-        const auto header = recordHeader(event.message.bytes());
-        if (!header || header->type == 2 || header->logCode() != code || header->record.size() < minimum)
-            continue;
-        ++seen;
-        look(header->record);
-    }
-    EXPECT_GT(seen, 0) << std::hex << code;
-}
-
-/// What a record of each code needs: its least length, and the bytes that its counts ask for.
-struct Requirement {
-    std::size_t minimum;
-    std::function<std::size_t(Bytes record)> needed;
-};
-
-const std::map<std::uint32_t, Requirement> requirements = {
+const Requirements requirements = {
     {0x4005, {15, [](Bytes r) { return 15U + std::max(7U * r[14], 10U * r[13]); }}},
     {0x4031, {16, [](Bytes r) { return 16U + 14U * r[14]; }}},
     {0x4116, {16, [](Bytes r) { return 16U + 9U * r[13]; }}},
@@ -94,174 +55,105 @@ const std::map<std::uint32_t, Requirement> requirements = {
     {0xFF0002, {14, nullptr}},
 };
 
+/// The requirements' codes.
+const std::set<std::uint32_t> codes = codesOf(requirements);
+
+/// Calls `look` with every record of that code that is as its table says.
+void eachRecord(std::uint32_t code, const std::function<void(Bytes)>& look) {
+    eachRecord(tenMinutes(), code, meets(requirements), look);
+}
+
 TEST(GSMScenarioTest, speaksOstrelGSM) {
     EXPECT_EQ(GSMScenario(1).technology(), kVoxLogChannelTechnology_Ostrel_GSM);
 }
 
 TEST(GSMScenarioTest, theSameSeedGivesTheSameBytes) {
-    const auto again = drive(1, 10min);
-    ASSERT_EQ(again.size(), tenMinutes().size());
-    for (std::size_t i = 0; i < again.size(); ++i) {
-        ASSERT_EQ(again[i].offset, tenMinutes()[i].offset) << i;
-        ASSERT_EQ(again[i].message, tenMinutes()[i].message) << i;
-    }
+    expectSame(driveOf<GSMScenario>(1, 10min), tenMinutes());
 }
 
 TEST(GSMScenarioTest, anotherSeedGivesAnotherDrive) {
-    std::set<std::vector<unsigned>> drives;
-    for (std::uint64_t seed = 1; seed <= 5; ++seed) {
-        std::vector<unsigned> cells;
-        for (const ScenarioEvent& event : drive(seed, 2min)) {
-            const auto header = recordHeader(event.message.bytes());
-            if (header && header->logCode() == 0x5134)
-                cells.push_back(u16(header->record, 13) << 8 | header->record[15]);
-        }
-        drives.insert(cells);
-    }
-    EXPECT_EQ(drives.size(), 5U);
+    const auto trait = [](const RecordHeader& header) -> std::optional<unsigned> {
+        if (header.logCode() != 0x5134)
+            return std::nullopt;
+        return u16(header.record, 13) << 8 | header.record[15];
+    };
+    EXPECT_EQ(differentDrives<GSMScenario>(trait), 5U);
 }
 
 TEST(GSMScenarioTest, everyCodeComesWithinARound) {
-    for (const std::uint64_t seed : {1U, 2U, 3U, 99U}) {
-        std::set<std::uint32_t> missing;
-        for (const auto& [code, requirement] : requirements)
-            missing.insert(code);
-        for (const ScenarioEvent& event : drive(seed, 6min))
-            if (const auto header = recordHeader(event.message.bytes()))
-                missing.erase(header->logCode());
-        EXPECT_THAT(missing, ::testing::IsEmpty()) << "seed " << seed;
+    for (const std::uint64_t seed : severalSeeds) {
+        SCOPED_TRACE(seed);
+        expectEachCode(driveOf<GSMScenario>(seed, 6min), codes, meets(requirements));
     }
 }
 
 TEST(GSMScenarioTest, aboutTwentyMessagesComeASecond) {
-    const double rate = static_cast<double>(tenMinutes().size()) / 600;
-    EXPECT_GE(rate, 15);
-    EXPECT_LE(rate, 25);
+    expectRate(tenMinutes(), 10min, 15, 25);
 }
 
 TEST(GSMScenarioTest, recordsAreAsTheirTablesSayButForTheOddOnes) {
-    std::map<std::uint32_t, int> good;
-    int belowMinimum = 0;
-    int overrun = 0;
-    for (const ScenarioEvent& event : tenMinutes()) {
-        const auto header = recordHeader(event.message.bytes());
-        if (!header || header->type == 2)
-            continue;
-        EXPECT_EQ(header->length, header->record.size() - 1);
-        const auto found = requirements.find(header->logCode());
-        if (found == requirements.end())
-            continue;
-        if (header->record.size() < found->second.minimum)
-            ++belowMinimum;
-        else if (found->second.needed && header->record.size() < found->second.needed(header->record))
-            ++overrun;
-        else
-            ++good[found->first];
-    }
-    EXPECT_EQ(good.size(), requirements.size());
+    const RecordCensus census = censusOf(tenMinutes(), requirements);
+    EXPECT_EQ(codesOf(census.good), codes);
     // One odd message every ten seconds, a sixth of them of each kind.
-    EXPECT_GE(belowMinimum, 3);
-    EXPECT_LE(belowMinimum, 20);
-    EXPECT_GE(overrun, 3);
-    EXPECT_LE(overrun, 20);
+    EXPECT_GE(countOf(census.belowMinimum), 3U);
+    EXPECT_LE(countOf(census.belowMinimum), 20U);
+    EXPECT_GE(countOf(census.overrun), 3U);
+    EXPECT_LE(countOf(census.overrun), 20U);
 }
 
 TEST(GSMScenarioTest, everyKindOfOddMessageComes) {
-    int tooShort = 0;
-    int wrongType = 0;
-    int prefixed = 0;
-    int unknownCode = 0;
-    for (const ScenarioEvent& event : tenMinutes()) {
-        const auto header = recordHeader(event.message.bytes());
-        if (!header) {
-            EXPECT_EQ(event.message.size(), 5U);
-            EXPECT_EQ(event.message.bytes()[0], 1);
-            ++tooShort;
-        } else if (header->prefixed) {
-            EXPECT_EQ(header->type, 1);
-            EXPECT_TRUE(requirements.contains(header->logCode()));
-            EXPECT_GE(header->record.size(), requirements.at(header->logCode()).minimum);
-            ++prefixed;
-        } else if (header->type == 2) {
-            ++wrongType;
-        } else {
-            EXPECT_THAT(header->type, ::testing::AnyOf(1, 0xFF));
-            unknownCode += !requirements.contains(header->logCode());
-        }
-    }
-    for (const int count : {tooShort, wrongType, prefixed, unknownCode})
+    const OddMessages odd = oddMessagesOf(tenMinutes(), meets(requirements), codes);
+    for (const int count : {odd.tooShort, odd.wrongType, odd.prefixed, odd.unknownCode})
         EXPECT_GE(count, 3);
 }
 
 TEST(GSMScenarioTest, timeAscendsAndStampsFollowIt) {
-    std::chrono::nanoseconds last{0};
-    for (const ScenarioEvent& event : tenMinutes()) {
-        EXPECT_GE(event.offset, last);
-        last = event.offset;
-        const auto header = recordHeader(event.message.bytes());
-        if (header) {
-            EXPECT_EQ(header->timestamp, recordTimestamp(GSMScenario::beginning() + event.offset));
-        }
-    }
+    expectStampsFollow(tenMinutes());
 }
 
 TEST(GSMScenarioTest, extraPayloadsAreReadablePropertyListsOfBothForms) {
-    std::map<std::uint32_t, std::set<bool>> forms;
-    for (const ScenarioEvent& event : drive(4, 15min)) {
-        const auto header = recordHeader(event.message.bytes());
-        if (!header || header->type != 0xFF)
-            continue;
-        const Bytes payload = header->record.subspan(13);
-        const auto list = readPropertyList(payload);
-        ASSERT_TRUE(list) << list.reason();
-        forms[header->logCode()].insert(payload[0] == 'b');
-        if (header->code == 0) {
-            ASSERT_TRUE(list->asDictionary());
-            for (const auto& [key, value] : *list->asDictionary()) {
+    expectExtraLists(driveOf<GSMScenario>(4, 15min), [](unsigned code, const Value& list) {
+        if (code == 0) {
+            for (const auto& [key, value] : *list.asDictionary()) {
                 EXPECT_TRUE(key.starts_with("kSimFile_")) << key;
                 EXPECT_TRUE(value.asString()) << key;
             }
         } else {
-            ASSERT_TRUE(list->asArray());
-            for (const Value& each : *list->asArray())
+            for (const Value& each : *list.asArray())
                 EXPECT_TRUE(each.asDictionary());
         }
-    }
-    const std::set<bool> both = {false, true};
-    EXPECT_EQ(forms, (std::map<std::uint32_t, std::set<bool>>{
-                         {0xFF0000, both}, {0xFF0001, both}, {0xFF0002, both}}));
+    });
 }
 
 TEST(GSMScenarioTest, gsmValuesArePlausible) {
     const auto plausibleARFCN = [](unsigned arfcn) {
         return (arfcn >= 1 && arfcn <= 124) || (arfcn >= 512 && arfcn <= 885);
     };
-    eachRecord(0x5134, 26, [&](Bytes r) {
+    eachRecord(0x5134, [&](Bytes r) {
         EXPECT_TRUE(plausibleARFCN(u16(r, 13)));
         EXPECT_LE(u16(r, 15), 63U);
     });
     std::set<int> levels;
-    eachRecord(0x5137, 29, [&](Bytes r) {
+    eachRecord(0x5137, [&](Bytes r) {
         levels.insert(r[15]);
         EXPECT_GE(r[15], 47);
         EXPECT_LE(r[15], 110);
-        const std::size_t whole = (r.size() - 29) / 14;
-        for (std::size_t i = 0; i < std::min<std::size_t>(r[28], whole); ++i) {
+        for (std::size_t i = 0; i < r[28]; ++i) {
             EXPECT_TRUE(plausibleARFCN(u16(r, 29 + 14 * i)));
             EXPECT_GE(r[31 + 14 * i], 47);
             EXPECT_LE(r[31 + 14 * i], 110);
         }
     });
     EXPECT_GE(levels.size(), 20U) << "levels rise and fall";
-    eachRecord(0x512C, 17, [](Bytes r) { EXPECT_LT(r[13], 22); });
-    eachRecord(0x51F8, 15, [&](Bytes r) {
+    eachRecord(0x512C, [](Bytes r) { EXPECT_LT(r[13], 22); });
+    eachRecord(0x51F8, [&](Bytes r) {
         EXPECT_LE(r[13], 63);
         EXPECT_TRUE(plausibleARFCN(u16(r, 15)));
     });
 }
 
 TEST(GSMScenarioTest, umtsValuesArePlausible) {
-    eachRecord(0x4005, 15, [](Bytes r) {
+    eachRecord(0x4005, [](Bytes r) {
         for (std::size_t i = 0; i < r[13]; ++i) {
             const std::size_t entry = 15 + 10 * i;
             EXPECT_GE(u16(r, entry), 10562U);
@@ -274,21 +166,21 @@ TEST(GSMScenarioTest, umtsValuesArePlausible) {
         }
     });
     std::set<int> rrcStates;
-    eachRecord(0x4125, 14, [&](Bytes r) { rrcStates.insert(r[13]); });
+    eachRecord(0x4125, [&](Bytes r) { rrcStates.insert(r[13]); });
     EXPECT_EQ(rrcStates, (std::set<int>{0, 1, 2, 3, 4, 5})) << "every state comes";
-    eachRecord(0x417A, 16, [](Bytes r) {
+    eachRecord(0x417A, [](Bytes r) {
         const int power_dBm = (static_cast<std::int16_t>(u16(r, 13)) + 512) / 10 - 106;
         EXPECT_GE(power_dBm, -110);
         EXPECT_LE(power_dBm, -25);
     });
-    eachRecord(0x4031, 16, [](Bytes r) {
+    eachRecord(0x4031, [](Bytes r) {
         for (std::size_t i = 0; i < r[14]; ++i) {
             const int power_dBm = (static_cast<std::int16_t>(u16(r, 20 + 14 * i)) + 512) / 10 - 70;
             EXPECT_GE(power_dBm, -50);
             EXPECT_LE(power_dBm, 24);
         }
     });
-    eachRecord(0x4221, 18, [](Bytes r) {
+    eachRecord(0x4221, [](Bytes r) {
         EXPECT_EQ(r[16], 6);
         for (std::size_t i = 0; i < r[16]; ++i)
             EXPECT_LE(u16(r, 25 + 9 * i), u16(r, 23 + 9 * i)) << "no more block errors than blocks";
@@ -314,14 +206,14 @@ TEST(GSMScenarioTest, eitherRankedListComesToBeTheLatest) {
 
 TEST(GSMScenarioTest, networksAreTestNetworks) {
     std::set<unsigned> areas;
-    eachRecord(0x7135, 32, [&](Bytes r) {
+    eachRecord(0x7135, [&](Bytes r) {
         EXPECT_EQ(r[15], 0x00);
         EXPECT_EQ(r[16], 0xF1) << "001, two-digit MNC";
         EXPECT_THAT(r[17], ::testing::AnyOf(0x10, 0x20)) << "01 or 02";
         areas.insert(static_cast<unsigned>(r[18]) << 8 | r[19]);
     });
     EXPECT_GE(areas.size(), 2U) << "the area changes on the way";
-    eachRecord(0x7150, 17, [](Bytes r) {
+    eachRecord(0x7150, [](Bytes r) {
         // The first entry's digits, MCC and MNC in turn.
         const int mcc = r[17] * 100 + r[19] * 10 + r[21];
         const int mnc = r[18] * 100 + r[20] * 10 + r[22];
@@ -359,7 +251,7 @@ TEST(GSMScenarioTest, theDriveGoesRound) {
     // Each round begins with a network search (registration state 5 after 0).
     int searches = 0;
     int last = -1;
-    for (const ScenarioEvent& event : drive(1, 30min)) {
+    for (const ScenarioEvent& event : driveOf<GSMScenario>(1, 30min)) {
         const auto header = recordHeader(event.message.bytes());
         if (!header || header->type != 1 || header->logCode() != 0x7132)
             continue;

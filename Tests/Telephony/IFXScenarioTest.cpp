@@ -5,6 +5,7 @@
 #include "Platform/TelephonyService.h"
 #include "Telephony/LogFilter.h"
 #include "Tests/Support/FakeClock.h"
+#include "Tests/Telephony/ScenarioTesting.h"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
@@ -18,15 +19,6 @@ namespace velmora {
 namespace {
 
 using namespace std::chrono_literals;
-
-/// All messages of the first `duration`.
-std::vector<ScenarioEvent> drive(std::uint64_t seed, std::chrono::nanoseconds duration) {
-    IFXScenario scenario(seed);
-    std::vector<ScenarioEvent> events;
-    for (ScenarioEvent event = scenario.next(); event.offset < duration; event = scenario.next())
-        events.push_back(std::move(event));
-    return events;
-}
 
 /// Whether it holds nothing that ends the application, and no key that the display's paths cannot bear.
 bool isDisplay(const Value& value) {
@@ -44,7 +36,7 @@ std::vector<Value> displays(std::uint64_t seed, std::chrono::nanoseconds duratio
     const FakeClock clock;
     GSMLogGenerator decoder(clock);
     std::vector<Value> result;
-    for (const ScenarioEvent& event : drive(seed, duration)) {
+    for (const ScenarioEvent& event : driveOf<IFXScenario>(seed, duration)) {
         Dictionary state;
         decoder.updateState(state, event.message);
         result.push_back(state["Display"]);
@@ -75,20 +67,17 @@ TEST(IFXScenarioTest, speaksIFX) {
 }
 
 TEST(IFXScenarioTest, theSameSeedGivesTheSameBytes) {
-    const auto once = drive(1, 10min);
-    const auto again = drive(1, 10min);
+    const Drive once = driveOf<IFXScenario>(1, 10min);
     ASSERT_EQ(once.size(), 600U) << "one message a second";
-    ASSERT_EQ(again.size(), once.size());
-    for (std::size_t i = 0; i < again.size(); ++i) {
-        ASSERT_EQ(again[i].offset, std::chrono::seconds(i));
-        ASSERT_EQ(again[i].message, once[i].message) << i;
-    }
+    for (std::size_t i = 0; i < once.size(); ++i)
+        ASSERT_EQ(once[i].offset, std::chrono::seconds(i));
+    expectSame(driveOf<IFXScenario>(1, 10min), once);
 }
 
 TEST(IFXScenarioTest, anotherSeedGivesAnotherDrive) {
     std::set<std::vector<std::uint8_t>> messages;
     for (std::uint64_t seed = 1; seed <= 5; ++seed) {
-        const Data last = drive(seed, 30s).back().message;
+        const Data last = driveOf<IFXScenario>(seed, 30s).back().message;
         messages.emplace(last.bytes().begin(), last.bytes().end());
     }
     EXPECT_EQ(messages.size(), 5U);
@@ -96,7 +85,7 @@ TEST(IFXScenarioTest, anotherSeedGivesAnotherDrive) {
 
 TEST(IFXScenarioTest, bothFormsComeByTurns) {
     bool binary = true;
-    for (const ScenarioEvent& event : drive(1, 1min)) {
+    for (const ScenarioEvent& event : driveOf<IFXScenario>(1, 1min)) {
         const std::string start(event.message.bytes().begin(), event.message.bytes().begin() + 6);
         EXPECT_EQ(start, binary ? "bplist" : "<?xml ");
         binary = !binary;
@@ -104,8 +93,8 @@ TEST(IFXScenarioTest, bothFormsComeByTurns) {
 }
 
 TEST(IFXScenarioTest, noMessageEverHoldsWhatEndsTheApplication) {
-    for (const std::uint64_t seed : {1U, 2U, 3U, 99U})
-        for (const ScenarioEvent& event : drive(seed, 15min)) {
+    for (const std::uint64_t seed : severalSeeds)
+        for (const ScenarioEvent& event : driveOf<IFXScenario>(seed, 15min)) {
             const auto list = readPropertyList(event.message.bytes());
             ASSERT_TRUE(list) << list.reason();
             EXPECT_TRUE(list->asDictionary());
@@ -117,7 +106,7 @@ TEST(IFXScenarioTest, theStartCommandsFilterLetsEverythingPass) {
     const FakeClock clock;
     const auto filter = LogFilter::fromStartCommand(*GSMLogGenerator(clock).getStartCommand());
     ASSERT_TRUE(filter) << filter.reason();
-    for (const ScenarioEvent& event : drive(1, 1min))
+    for (const ScenarioEvent& event : driveOf<IFXScenario>(1, 1min))
         EXPECT_TRUE(filter->passes(event.message.bytes()));
 }
 

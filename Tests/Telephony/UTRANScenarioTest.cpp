@@ -1,14 +1,11 @@
 #include "Telephony/UTRANScenario.h"
 
-#include "Platform/PropertyList.h"
 #include "Platform/TelephonyService.h"
-#include "Recording/RecordHeader.h"
-#include "Recording/RecordTime.h"
+#include "Tests/Telephony/ScenarioTesting.h"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
-#include <functional>
 #include <map>
 #include <set>
 #include <vector>
@@ -17,38 +14,18 @@ namespace velmora {
 namespace {
 
 using namespace std::chrono_literals;
-using ::testing::IsEmpty;
-
-/// All messages of the first `duration`.
-std::vector<ScenarioEvent> drive(std::uint64_t seed, std::chrono::nanoseconds duration) {
-    UTRANScenario scenario(seed);
-    std::vector<ScenarioEvent> events;
-    for (ScenarioEvent event = scenario.next(); event.offset < duration; event = scenario.next())
-        events.push_back(std::move(event));
-    return events;
-}
 
 /// Ten minutes of seed 1: nearly three rounds.
-const std::vector<ScenarioEvent>& tenMinutes() {
-    static const std::vector<ScenarioEvent> events = drive(1, 10min);
-    return events;
-}
-
-unsigned u16(Bytes record, std::size_t offset) {
-    return record[offset] | static_cast<unsigned>(record[offset + 1]) << 8;
+const Drive& tenMinutes() {
+    static const Drive drive = driveOf<UTRANScenario>(1, 10min);
+    return drive;
 }
 
 unsigned transportChannels(Bytes record) {
     return u16(record, 14) >> 6 & 0x3F;
 }
 
-/// What a record of each code needs: its least length, and the bytes that its counts ask for.
-struct Requirement {
-    std::size_t minimum;
-    std::function<std::size_t(Bytes record)> needed;
-};
-
-const std::map<std::uint32_t, Requirement> requirements = {
+const Requirements requirements = {
     {0xD00A, {21, [](Bytes r) { return 168U + 16U * (r[16] / 2U); }}},
     {0xD00C,
      {17,
@@ -63,20 +40,12 @@ const std::map<std::uint32_t, Requirement> requirements = {
     {0xFF0002, {14, nullptr}},
 };
 
+/// The requirements' codes.
+const std::set<std::uint32_t> codes = codesOf(requirements);
+
 /// Calls `look` with every whole record of that code.
 void eachRecord(std::uint32_t code, const std::function<void(Bytes)>& look) {
-    const Requirement& requirement = requirements.at(code);
-    int seen = 0;
-    for (const ScenarioEvent& event : tenMinutes()) {
-        const auto header = recordHeader(event.message.bytes());
-        if (!header || header->type == 2 || header->logCode() != code ||
-            header->record.size() < requirement.minimum ||
-            (requirement.needed && header->record.size() < requirement.needed(header->record)))
-            continue;
-        ++seen;
-        look(header->record);
-    }
-    EXPECT_GT(seen, 0) << std::hex << code;
+    eachRecord(tenMinutes(), code, meets(requirements), look);
 }
 
 TEST(UTRANScenarioTest, speaksOstrelUTRAN2) {
@@ -84,133 +53,56 @@ TEST(UTRANScenarioTest, speaksOstrelUTRAN2) {
 }
 
 TEST(UTRANScenarioTest, theSameSeedGivesTheSameBytes) {
-    const auto again = drive(1, 10min);
-    ASSERT_EQ(again.size(), tenMinutes().size());
-    for (std::size_t i = 0; i < again.size(); ++i) {
-        ASSERT_EQ(again[i].offset, tenMinutes()[i].offset) << i;
-        ASSERT_EQ(again[i].message, tenMinutes()[i].message) << i;
-    }
+    expectSame(driveOf<UTRANScenario>(1, 10min), tenMinutes());
 }
 
 TEST(UTRANScenarioTest, anotherSeedGivesAnotherDrive) {
-    std::set<std::vector<unsigned>> drives;
-    for (std::uint64_t seed = 1; seed <= 5; ++seed) {
-        std::vector<unsigned> cells;
-        for (const ScenarioEvent& event : drive(seed, 2min)) {
-            const auto header = recordHeader(event.message.bytes());
-            if (header && header->logCode() == 0xD0E2 && header->record.size() >= 26)
-                cells.push_back(u16(header->record, 19) << 16 | u16(header->record, 21));
-        }
-        drives.insert(cells);
-    }
-    EXPECT_EQ(drives.size(), 5U);
+    const auto trait = [](const RecordHeader& header) -> std::optional<unsigned> {
+        if (header.logCode() != 0xD0E2 || header.record.size() < 26)
+            return std::nullopt;
+        return u16(header.record, 19) << 16 | u16(header.record, 21);
+    };
+    EXPECT_EQ(differentDrives<UTRANScenario>(trait), 5U);
 }
 
 TEST(UTRANScenarioTest, everyCodeComesWithinARound) {
-    for (const std::uint64_t seed : {1U, 2U, 3U, 99U}) {
-        std::set<std::uint32_t> missing;
-        for (const auto& [code, requirement] : requirements)
-            missing.insert(code);
-        for (const ScenarioEvent& event : drive(seed, 2min))
-            if (const auto header = recordHeader(event.message.bytes()))
-                missing.erase(header->logCode());
-        EXPECT_THAT(missing, IsEmpty()) << "seed " << seed;
+    for (const std::uint64_t seed : severalSeeds) {
+        SCOPED_TRACE(seed);
+        expectEachCode(driveOf<UTRANScenario>(seed, 2min), codes, meets(requirements));
     }
 }
 
 TEST(UTRANScenarioTest, aboutTenMessagesComeASecond) {
-    const double rate = static_cast<double>(tenMinutes().size()) / 600;
-    EXPECT_GE(rate, 7);
-    EXPECT_LE(rate, 16);
+    expectRate(tenMinutes(), 10min, 7, 16);
 }
 
 TEST(UTRANScenarioTest, recordsAreAsTheirTablesSayButForTheOddOnes) {
-    std::map<std::uint32_t, int> good;
-    std::set<std::uint32_t> belowMinimum;
-    std::set<std::uint32_t> overrun;
-    int odd = 0;
-    for (const ScenarioEvent& event : drive(1, 30min)) {
-        const auto header = recordHeader(event.message.bytes());
-        if (!header || header->type == 2)
-            continue;
-        EXPECT_EQ(header->length, header->record.size() - 1);
-        const auto found = requirements.find(header->logCode());
-        if (found == requirements.end())
-            continue;
-        if (header->record.size() < found->second.minimum) {
-            // Just one byte short.
-            EXPECT_EQ(header->record.size(), found->second.minimum - 1);
-            belowMinimum.insert(found->first);
-            ++odd;
-        } else if (found->second.needed && header->record.size() < found->second.needed(header->record)) {
-            overrun.insert(found->first);
-            ++odd;
-        } else {
-            ++good[found->first];
-        }
-    }
-    EXPECT_EQ(good.size(), requirements.size());
-    EXPECT_EQ(belowMinimum, (std::set<std::uint32_t>{0xD0E0, 0xD0E2}));
-    EXPECT_EQ(overrun, (std::set<std::uint32_t>{0xD00A, 0xD00C, 0xD00E}));
+    const Drive drive = driveOf<UTRANScenario>(1, 30min);
+    const RecordCensus census = censusOf(drive, requirements);
+    EXPECT_EQ(codesOf(census.good), codes);
+    EXPECT_EQ(codesOf(census.belowMinimum), (std::set<std::uint32_t>{0xD0E0, 0xD0E2}));
+    for (const auto& [code, records] : census.belowMinimum)
+        for (const Bytes record : records)
+            EXPECT_EQ(record.size(), requirements.at(code).minimum - 1) << "just one byte short";
+    EXPECT_EQ(codesOf(census.overrun), (std::set<std::uint32_t>{0xD00A, 0xD00C, 0xD00E}));
     // One odd message every ten seconds, a third of them of these two kinds.
-    EXPECT_GE(odd, 40);
-    EXPECT_LE(odd, 90);
+    const std::size_t odd = countOf(census.belowMinimum) + countOf(census.overrun);
+    EXPECT_GE(odd, 40U);
+    EXPECT_LE(odd, 90U);
 }
 
 TEST(UTRANScenarioTest, everyKindOfOddMessageComes) {
-    int tooShort = 0;
-    int wrongType = 0;
-    int prefixed = 0;
-    int unknownCode = 0;
-    for (const ScenarioEvent& event : tenMinutes()) {
-        const auto header = recordHeader(event.message.bytes());
-        if (!header) {
-            EXPECT_EQ(event.message.size(), 5U);
-            EXPECT_EQ(event.message.bytes()[0], 1);
-            ++tooShort;
-        } else if (header->prefixed) {
-            EXPECT_EQ(header->type, 1);
-            EXPECT_EQ(header->logCode(), 0xD0E0U);
-            EXPECT_EQ(header->record.size(), 15U);
-            ++prefixed;
-        } else if (header->type == 2) {
-            ++wrongType;
-        } else {
-            EXPECT_THAT(header->type, ::testing::AnyOf(1, 0xFF));
-            unknownCode += header->logCode() == 0x1375;
-        }
-    }
-    for (const int count : {tooShort, wrongType, prefixed, unknownCode})
+    const OddMessages odd = oddMessagesOf(tenMinutes(), meets(requirements), codes);
+    for (const int count : {odd.tooShort, odd.wrongType, odd.prefixed, odd.unknownCode})
         EXPECT_GE(count, 3);
 }
 
 TEST(UTRANScenarioTest, timeAscendsAndStampsFollowIt) {
-    std::chrono::nanoseconds last{0};
-    for (const ScenarioEvent& event : tenMinutes()) {
-        EXPECT_GE(event.offset, last);
-        last = event.offset;
-        if (const auto header = recordHeader(event.message.bytes())) {
-            EXPECT_EQ(header->timestamp, recordTimestamp(UTRANScenario::beginning() + event.offset));
-        }
-    }
+    expectStampsFollow(tenMinutes());
 }
 
 TEST(UTRANScenarioTest, extraPayloadsAreReadablePropertyListsOfBothForms) {
-    std::map<std::uint32_t, std::set<bool>> forms;
-    for (const ScenarioEvent& event : drive(4, 15min)) {
-        const auto header = recordHeader(event.message.bytes());
-        if (!header || header->type != 0xFF)
-            continue;
-        const Bytes payload = header->record.subspan(13);
-        const auto list = readPropertyList(payload);
-        ASSERT_TRUE(list) << list.reason();
-        forms[header->logCode()].insert(payload[0] == 'b');
-        EXPECT_EQ(list->asDictionary() != nullptr, header->code == 0);
-        EXPECT_EQ(list->asArray() != nullptr, header->code != 0);
-    }
-    const std::set<bool> both = {false, true};
-    EXPECT_EQ(forms, (std::map<std::uint32_t, std::set<bool>>{
-                         {0xFF0000, both}, {0xFF0001, both}, {0xFF0002, both}}));
+    expectExtraLists(driveOf<UTRANScenario>(4, 15min), [](unsigned, const Value&) {});
 }
 
 TEST(UTRANScenarioTest, valuesArePlausible) {
@@ -302,7 +194,7 @@ TEST(UTRANScenarioTest, anIdlePhoneRegistersWhereTheAreaChanges) {
     unsigned area = 0;
     int changes = 0;
     auto due = std::chrono::nanoseconds::max(); // the registration, where the network does not know yet
-    for (const ScenarioEvent& event : drive(1, 30min)) {
+    for (const ScenarioEvent& event : driveOf<UTRANScenario>(1, 30min)) {
         const auto header = recordHeader(event.message.bytes());
         if (!header || header->type != 1)
             continue;

@@ -1,7 +1,7 @@
 #include "LogGenerator/LTE/ConnectedModeMeasurementMisc.h"
 #include "LogGenerator/LTE/DetectedCells.h"
 #include "LogGenerator/LTE/MeasuredNeighborCells.h"
-#include "Tests/LogGenerator/OstrelGSM/SectionHarness.h"
+#include "Tests/LogGenerator/SectionHarness.h"
 #include "Tests/Support/Hex.h"
 
 #include <gmock/gmock.h>

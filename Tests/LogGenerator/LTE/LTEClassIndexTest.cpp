@@ -1,26 +1,14 @@
 #include "LogGenerator/LTE/LTEClassIndex.h"
 
-#include "Platform/Console.h"
-#include "Tests/Support/CapturedLog.h"
+#include "Tests/LogGenerator/ClassIndexTesting.h"
 
 #include <gmock/gmock.h>
-
-#include <cstdio>
 
 namespace velmora {
 
 namespace {
 
 using testing::ElementsAre;
-using testing::ElementsAreArray;
-
-std::vector<std::string> subscribers(const ClassIndex& index, std::uint32_t code) {
-    std::vector<std::string> names;
-    if (const std::vector<Base*>* sections = index.getSubscribers(code))
-        for (const Base* section : *sections)
-            names.emplace_back(section->getSectionName());
-    return names;
-}
 
 TEST(LTEClassIndex, HoldsElevenSectionsUnderTheirNames) {
     const LTEClassIndex index;
@@ -57,27 +45,14 @@ TEST(LTEClassIndex, SubscribersStandInTheOrderOfCreation) {
 }
 
 TEST(LTEClassIndex, CreatesTheSectionsInOrder) {
-    // Each section announces on registration how many codes it wants.
-    CapturedLog log;
+    const CapturedLog log;
     const LTEClassIndex index;
-    std::vector<std::string> expected;
-    for (const int count : {3, 1, 1, 1, 1, 1, 1, 1, 1, 1, 1})
-        expected.push_back("Array Count: " + std::to_string(count));
-    EXPECT_THAT(log.textsAt(LogPriority::Warning), ElementsAreArray(expected));
-    EXPECT_EQ(log.lines().size(), 11u);
+    expectCodeCounts(log, {3, 1, 1, 1, 1, 1, 1, 1, 1, 1, 1});
 }
 
 TEST(LTEClassIndex, SaysOnTheConsoleThatItGoes) {
-    std::FILE* printed = std::tmpfile();
-    ASSERT_NE(printed, nullptr);
-    std::FILE* earlier = redirectConsole(printed);
-    { const LTEClassIndex index; }
-    redirectConsole(earlier);
-    std::rewind(printed);
-    char text[200] = {};
-    const std::size_t length = std::fread(text, 1, sizeof text, printed);
-    std::fclose(printed);
-    EXPECT_EQ(std::string(text, length), "Deallocing LTEClassIndex\nDeallocing ClassIndex\n");
+    EXPECT_EQ(printedBy([] { const LTEClassIndex index; }),
+              "Deallocing LTEClassIndex\nDeallocing ClassIndex\n");
 }
 
 } // namespace

@@ -1,93 +1,29 @@
 #include "LogGenerator/LTE/LTELogGenerator.h"
 
 #include "Platform/TelephonyService.h"
-#include "Tests/LogGenerator/OstrelGSM/SectionHarness.h"
-#include "Tests/Support/FakeClock.h"
-#include "Tests/Support/FakeResources.h"
+#include "Tests/LogGenerator/DecoderFixture.h"
 #include "Tests/Support/Hex.h"
 
 #include <gmock/gmock.h>
-
-#include <algorithm>
-#include <fstream>
-#include <iterator>
 
 namespace velmora {
 
 namespace {
 
-using testing::ElementsAre;
-
-/// The display template that is shipped.
-Data templateFile() {
-    std::ifstream file(VELMORA_SOURCE_DIR "/Resources/LTE.plist", std::ios::binary);
-    return Data(std::vector<std::uint8_t>(std::istreambuf_iterator<char>(file), {}));
-}
-
-class LTEGenerator : public testing::Test {
+class LTEGenerator : public DecoderFixture {
 protected:
-    LTEGenerator() {
-        resources.put("LTE", "plist", templateFile());
-        // Builds the display, so that later log lines are the sections' alone.
-        generator->updateState(state, recordWith(0x0001, 13));
-    }
-
-    LogLines update(const Data& record) {
-        CapturedLog log;
-        generator->updateState(state, record);
-        return log.lines();
-    }
-    [[nodiscard]] std::string node(std::string_view group, std::string_view section) const {
-        return shown((*(*state["Display"].asDictionary())[group].asDictionary())[section]);
-    }
-
-    FakeClock clock;
-    FakeResources resources;
-    std::unique_ptr<LogGenerator> generator =
-        LogGenerator::generatorFromTechnology(kVoxLogChannelTechnology_Ostrel_LTE, clock);
-    Dictionary state;
+    LTEGenerator() : DecoderFixture("LTE", kVoxLogChannelTechnology_Ostrel_LTE) {}
 };
-
-std::vector<std::int64_t> numbers(const Value& list) {
-    std::vector<std::int64_t> result;
-    for (const Value& number : *list.asArray())
-        result.push_back(*number.asInteger());
-    std::sort(result.begin(), result.end());
-    return result;
-}
 
 TEST_F(LTEGenerator, IsTheTechnologysDecoder) {
     EXPECT_NE(dynamic_cast<LTELogGenerator*>(generator.get()), nullptr);
-    CapturedLog log;
-    std::unique_ptr<LTELogGenerator> another = LTELogGenerator::generator(clock);
-    ASSERT_FALSE(log.lines().empty());
-    EXPECT_EQ(log.lines().front(),
-              (CapturedLog::Line{LogPriority::Error, "Creating LTELogGenerator object"}));
-    char address[40];
-    std::snprintf(address, sizeof address, "%p", static_cast<void*>(another.get()));
-    log.clear();
-    another.reset();
-    const std::string place(address);
     // The base class, which is at the same address, has one wording for every technology.
-    EXPECT_EQ(log.lines(),
-              (LogLines{{LogPriority::Warning, "LTELogGenerator is destructed " + place},
-                        {LogPriority::Warning, "Ostrel_GSMLogGenerator is destructed " + place}}));
+    expectFirstAndLastLines<LTELogGenerator>("Creating LTELogGenerator object",
+                                             {"LTELogGenerator", "Ostrel_GSMLogGenerator"});
 }
 
 TEST_F(LTEGenerator, AsksForTheCodesOfItsSections) {
-    const DictionaryRef command = generator->getStartCommand();
-    EXPECT_EQ(command->size(), 3u);
-    EXPECT_EQ((*command)["SetState"], Value("Streaming"));
-    EXPECT_THAT(numbers((*command)["SetOstrelLogCodes"]),
-                ElementsAre(45249, 45250, 45433, 45439, 45440, 45446));
-    EXPECT_THAT(numbers((*command)["SetVoxExtraCodes"]), ElementsAre(0, 1, 2));
-}
-
-LogLines traces(std::initializer_list<const char*> words) {
-    LogLines lines;
-    for (const char* word : words)
-        lines.push_back({LogPriority::Warning, word});
-    return lines;
+    expectStartCommand({45249, 45250, 45433, 45439, 45440, 45446});
 }
 
 TEST_F(LTEGenerator, ARecordReachesItsSectionsInOrder) {

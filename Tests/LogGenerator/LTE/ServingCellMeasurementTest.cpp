@@ -1,7 +1,7 @@
 #include "LogGenerator/LTE/ServingCellMeasurement.h"
 
 #include "Tests/LogGenerator/LTE/BitFields.h"
-#include "Tests/LogGenerator/OstrelGSM/SectionHarness.h"
+#include "Tests/LogGenerator/SectionHarness.h"
 #include "Tests/Support/Hex.h"
 
 #include <gmock/gmock.h>

@@ -1,6 +1,6 @@
 #include "LogGenerator/OstrelGSM/MobileAllocation.h"
 
-#include "Tests/LogGenerator/OstrelGSM/SectionHarness.h"
+#include "Tests/LogGenerator/SectionHarness.h"
 #include "Tests/Support/Hex.h"
 
 #include <gmock/gmock.h>

@@ -1,26 +1,14 @@
 #include "LogGenerator/OstrelGSM/Ostrel_GSMClassIndex.h"
 
-#include "Platform/Console.h"
-#include "Tests/Support/CapturedLog.h"
+#include "Tests/LogGenerator/ClassIndexTesting.h"
 
 #include <gmock/gmock.h>
-
-#include <cstdio>
 
 namespace velmora {
 
 namespace {
 
 using testing::ElementsAre;
-using testing::ElementsAreArray;
-
-std::vector<std::string> subscribers(const ClassIndex& index, std::uint32_t code) {
-    std::vector<std::string> names;
-    if (const std::vector<Base*>* sections = index.getSubscribers(code))
-        for (const Base* section : *sections)
-            names.emplace_back(section->getSectionName());
-    return names;
-}
 
 TEST(Ostrel_GSMClassIndex, HoldsTwentySixSectionsUnderTheirNames) {
     const Ostrel_GSMClassIndex index;
@@ -96,28 +84,14 @@ TEST(Ostrel_GSMClassIndex, SubscribersOfTheOtherCodes) {
 }
 
 TEST(Ostrel_GSMClassIndex, CreatesTheSectionsInOrder) {
-    // Each section announces on registration how many codes it wants.
-    CapturedLog log;
+    const CapturedLog log;
     const Ostrel_GSMClassIndex index;
-    const int counts[] = {1, 0, 7, 4, 1, 3, 1, 2, 0, 0, 1, 1, 0, 2, 3, 2, 1, 4, 1, 0, 2, 5, 1, 1, 1, 1};
-    std::vector<std::string> expected;
-    for (const int count : counts)
-        expected.push_back("Array Count: " + std::to_string(count));
-    EXPECT_THAT(log.textsAt(LogPriority::Warning), ElementsAreArray(expected));
-    EXPECT_EQ(log.lines().size(), 26u);
+    expectCodeCounts(log, {1, 0, 7, 4, 1, 3, 1, 2, 0, 0, 1, 1, 0, 2, 3, 2, 1, 4, 1, 0, 2, 5, 1, 1, 1, 1});
 }
 
 TEST(Ostrel_GSMClassIndex, SaysOnTheConsoleThatItGoes) {
-    std::FILE* printed = std::tmpfile();
-    ASSERT_NE(printed, nullptr);
-    std::FILE* earlier = redirectConsole(printed);
-    { const Ostrel_GSMClassIndex index; }
-    redirectConsole(earlier);
-    std::rewind(printed);
-    char text[200] = {};
-    const std::size_t length = std::fread(text, 1, sizeof text, printed);
-    std::fclose(printed);
-    EXPECT_EQ(std::string(text, length), "Deallocing Ostrel_GSMClassIndex\nDeallocing ClassIndex\n");
+    EXPECT_EQ(printedBy([] { const Ostrel_GSMClassIndex index; }),
+              "Deallocing Ostrel_GSMClassIndex\nDeallocing ClassIndex\n");
 }
 
 } // namespace

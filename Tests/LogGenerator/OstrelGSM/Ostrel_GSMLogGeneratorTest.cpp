@@ -1,95 +1,31 @@
 #include "LogGenerator/OstrelGSM/Ostrel_GSMLogGenerator.h"
 
 #include "Platform/TelephonyService.h"
-#include "Tests/LogGenerator/OstrelGSM/SectionHarness.h"
-#include "Tests/Support/FakeClock.h"
-#include "Tests/Support/FakeResources.h"
+#include "Tests/LogGenerator/DecoderFixture.h"
 #include "Tests/Support/Hex.h"
 
 #include <gmock/gmock.h>
-
-#include <algorithm>
-#include <fstream>
-#include <iterator>
 
 namespace velmora {
 
 namespace {
 
-using testing::ElementsAre;
-using testing::HasSubstr;
-
-/// The display template that is shipped.
-Data templateFile() {
-    std::ifstream file(VELMORA_SOURCE_DIR "/Resources/Ostrel_GSM.plist", std::ios::binary);
-    return Data(std::vector<std::uint8_t>(std::istreambuf_iterator<char>(file), {}));
-}
-
-class Ostrel_GSMGenerator : public testing::Test {
+class Ostrel_GSMGenerator : public DecoderFixture {
 protected:
-    Ostrel_GSMGenerator() {
-        resources.put("Ostrel_GSM", "plist", templateFile());
-        // Builds the display, so that later log lines are the sections' alone.
-        generator->updateState(state, recordWith(0x0001, 13));
-    }
-
-    LogLines update(const Data& record) {
-        CapturedLog log;
-        generator->updateState(state, record);
-        return log.lines();
-    }
-    [[nodiscard]] std::string node(std::string_view group, std::string_view section) const {
-        return shown((*(*state["Display"].asDictionary())[group].asDictionary())[section]);
-    }
-
-    FakeClock clock;
-    FakeResources resources;
-    std::unique_ptr<LogGenerator> generator =
-        LogGenerator::generatorFromTechnology(kVoxLogChannelTechnology_Ostrel_GSM, clock);
-    Dictionary state;
+    Ostrel_GSMGenerator() : DecoderFixture("Ostrel_GSM", kVoxLogChannelTechnology_Ostrel_GSM) {}
 };
-
-std::vector<std::int64_t> numbers(const Value& list) {
-    std::vector<std::int64_t> result;
-    for (const Value& number : *list.asArray())
-        result.push_back(*number.asInteger());
-    std::sort(result.begin(), result.end());
-    return result;
-}
 
 TEST_F(Ostrel_GSMGenerator, IsTheTechnologysDecoder) {
     EXPECT_NE(dynamic_cast<Ostrel_GSMLogGenerator*>(generator.get()), nullptr);
-    CapturedLog log;
-    std::unique_ptr<Ostrel_GSMLogGenerator> another = Ostrel_GSMLogGenerator::generator(clock);
-    ASSERT_FALSE(log.lines().empty());
-    EXPECT_EQ(log.lines().front(),
-              (CapturedLog::Line{LogPriority::Error, "Creating Ostrel_GSMLogGenerator object"}));
-    char address[40];
-    std::snprintf(address, sizeof address, "%p", static_cast<void*>(another.get()));
-    log.clear();
-    another.reset();
-    const std::string destructed = "Ostrel_GSMLogGenerator is destructed " + std::string(address);
     // The base class, which is at the same address, says the same once more.
-    EXPECT_EQ(log.lines(),
-              (LogLines{{LogPriority::Warning, destructed}, {LogPriority::Warning, destructed}}));
+    expectFirstAndLastLines<Ostrel_GSMLogGenerator>("Creating Ostrel_GSMLogGenerator object",
+                                                    {"Ostrel_GSMLogGenerator", "Ostrel_GSMLogGenerator"});
 }
 
 TEST_F(Ostrel_GSMGenerator, AsksForTheCodesOfItsSections) {
-    const DictionaryRef command = generator->getStartCommand();
-    EXPECT_EQ(command->size(), 3u);
-    EXPECT_EQ((*command)["SetState"], Value("Streaming"));
-    EXPECT_THAT(numbers((*command)["SetOstrelLogCodes"]),
-                ElementsAre(16389, 16433, 16662, 16677, 16679, 16727, 16762, 16929, 20594, 20598, 20780,
-                            20788, 20791, 20980, 20981, 20982, 20984, 20987, 20989, 20991, 28976, 28977,
-                            28978, 28981, 29008));
-    EXPECT_THAT(numbers((*command)["SetVoxExtraCodes"]), ElementsAre(0, 1, 2));
-}
-
-LogLines traces(std::initializer_list<const char*> words) {
-    LogLines lines;
-    for (const char* word : words)
-        lines.push_back({LogPriority::Warning, word});
-    return lines;
+    expectStartCommand({16389, 16433, 16662, 16677, 16679, 16727, 16762, 16929, 20594,
+                        20598, 20780, 20788, 20791, 20980, 20981, 20982, 20984, 20987,
+                        20989, 20991, 28976, 28977, 28978, 28981, 29008});
 }
 
 TEST_F(Ostrel_GSMGenerator, ARecordReachesItsSectionsInOrder) {

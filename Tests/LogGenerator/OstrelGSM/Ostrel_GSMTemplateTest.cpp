@@ -1,94 +1,32 @@
 #include "LogGenerator/OstrelGSM/Ostrel_GSMClassIndex.h"
-#include "Platform/PropertyList.h"
+#include "Tests/LogGenerator/TemplateCheck.h"
 
-#include <gmock/gmock.h>
-
-#include <fstream>
-#include <iterator>
-#include <set>
+#include <gtest/gtest.h>
 
 namespace velmora {
 
 namespace {
 
-using testing::ElementsAre;
-
-/// The sections whose node is a list of rows; those of all others are dictionaries.
-const std::set<std::string, std::less<>> lists = {
-    "Equivalent PLMN List", "Neighboring Cells", "Active Set", "Detected Set",    "Monitored Set",
-    "Virtual Active Set",   "GSM Set",           "UMTS Set",   "PDP Context Info"};
-
-struct Node {
-    std::string key;
-    Value value;
-};
-
-/// Every key of the template with its value, at whatever depth.
-void collect(const Value& value, std::vector<Node>& nodes) {
-    if (const Dictionary* dictionary = value.asDictionary())
-        for (const auto& [key, entry] : *dictionary) {
-            nodes.push_back({key, entry});
-            collect(entry, nodes);
-        }
-    if (const Array* array = value.asArray())
-        for (const Value& element : *array)
-            collect(element, nodes);
-}
-
 class Ostrel_GSMTemplate : public testing::Test {
 protected:
-    Ostrel_GSMTemplate() {
-        std::ifstream file(VELMORA_SOURCE_DIR "/Resources/Ostrel_GSM.plist", std::ios::binary);
-        const std::vector<std::uint8_t> bytes(std::istreambuf_iterator<char>(file), {});
-        const Result<Value> read = readPropertyList(bytes);
-        if (!read)
-            throw std::runtime_error(read.reason());
-        root = *read;
-        collect(root, nodes);
-    }
-
-    Value root;
-    std::vector<Node> nodes;
-    Ostrel_GSMClassIndex index;
+    const std::vector<TemplateNode> nodes = shippedTemplate("Ostrel_GSM.plist");
+    const Ostrel_GSMClassIndex index;
 };
 
 TEST_F(Ostrel_GSMTemplate, HoldsEverySectionOnceAndOfItsKind) {
     ASSERT_EQ(index.classDict.size(), 26u);
-    for (const auto& [name, section] : index.classDict) {
-        SCOPED_TRACE(name);
-        int found = 0;
-        for (const Node& node : nodes)
-            if (node.key == name) {
-                ++found;
-                EXPECT_EQ(nameOf(node.value.kind()), lists.contains(name) ? "array" : "dictionary");
-                // Empty, so that nothing is shown that the phone has not reported.
-                if (const Dictionary* dictionary = node.value.asDictionary()) {
-                    EXPECT_TRUE(dictionary->empty());
-                }
-                if (const Array* array = node.value.asArray()) {
-                    EXPECT_TRUE(array->empty());
-                }
-            }
-        EXPECT_EQ(found, 1);
-    }
+    expectEverySectionOnce(nodes, index,
+                           {"Equivalent PLMN List", "Neighboring Cells", "Active Set", "Detected Set",
+                            "Monitored Set", "Virtual Active Set", "GSM Set", "UMTS Set",
+                            "PDP Context Info"});
 }
 
 TEST_F(Ostrel_GSMTemplate, HoldsNothingElseButTheGroupsAroundThem) {
-    std::vector<std::string> others;
-    for (const Node& node : nodes)
-        if (!index.getClass(node.key)) {
-            others.push_back(node.key);
-            // A group holds sections; a section under a misspelt name would hold nothing.
-            const Dictionary* group = node.value.asDictionary();
-            ASSERT_NE(group, nullptr) << node.key;
-            EXPECT_FALSE(group->empty()) << node.key;
-        }
-    EXPECT_THAT(others, ElementsAre("Registration", "GSM", "UMTS", "Reselection", "Packet Data"));
+    expectGroups(nodes, index, {"Registration", "GSM", "UMTS", "Reselection", "Packet Data"});
 }
 
 TEST_F(Ostrel_GSMTemplate, KeysArePathComponents) {
-    for (const Node& node : nodes)
-        EXPECT_EQ(node.key.find('/'), std::string::npos) << node.key;
+    expectPathComponents(nodes);
 }
 
 } // namespace

@@ -1,7 +1,7 @@
 #include "LogGenerator/OstrelGSM/ProcessCO.h"
 #include "LogGenerator/OstrelGSM/ProcessCS.h"
 #include "LogGenerator/OstrelGSM/ProcessPS.h"
-#include "Tests/LogGenerator/OstrelGSM/SectionHarness.h"
+#include "Tests/LogGenerator/SectionHarness.h"
 #include "Tests/Support/Hex.h"
 
 #include <gtest/gtest.h>

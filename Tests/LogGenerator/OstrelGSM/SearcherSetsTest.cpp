@@ -2,7 +2,7 @@
 #include "LogGenerator/OstrelGSM/DetectedSet.h"
 #include "LogGenerator/OstrelGSM/MonitoredSet.h"
 #include "LogGenerator/OstrelGSM/VirtualActiveSet.h"
-#include "Tests/LogGenerator/OstrelGSM/SectionHarness.h"
+#include "Tests/LogGenerator/SectionHarness.h"
 #include "Tests/Support/Hex.h"
 
 #include <gmock/gmock.h>

@@ -1,5 +1,5 @@
 #include "LogGenerator/OstrelGSM/Ostrel_GSMClassIndex.h"
-#include "Tests/LogGenerator/OstrelGSM/SectionHarness.h"
+#include "Tests/LogGenerator/SectionHarness.h"
 
 #include <gtest/gtest.h>
 

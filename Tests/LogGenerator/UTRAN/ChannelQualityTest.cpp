@@ -1,7 +1,7 @@
 #include "LogGenerator/UTRAN/CCTRCHSIRMeasurement.h"
 #include "LogGenerator/UTRAN/TRCHBLERMeasurement.h"
 
-#include "Tests/LogGenerator/OstrelGSM/SectionHarness.h"
+#include "Tests/LogGenerator/SectionHarness.h"
 #include "Tests/Support/Hex.h"
 
 #include <gmock/gmock.h>

@@ -1,25 +1,14 @@
 #include "LogGenerator/UTRAN/UTRANClassIndex.h"
 
-#include "Platform/Console.h"
-#include "Tests/Support/CapturedLog.h"
+#include "Tests/LogGenerator/ClassIndexTesting.h"
 
 #include <gmock/gmock.h>
-
-#include <cstdio>
 
 namespace velmora {
 
 namespace {
 
 using testing::ElementsAre;
-
-std::vector<std::string> subscribers(const ClassIndex& index, std::uint32_t code) {
-    std::vector<std::string> names;
-    if (const std::vector<Base*>* sections = index.getSubscribers(code))
-        for (const Base* section : *sections)
-            names.emplace_back(section->getSectionName());
-    return names;
-}
 
 TEST(UTRANClassIndex, HoldsEightSectionsUnderTheirNames) {
     const UTRANClassIndex index;
@@ -49,26 +38,13 @@ TEST(UTRANClassIndex, SubscribersStandInTheOrderOfCreation) {
 }
 
 TEST(UTRANClassIndex, CreatesTheSectionsInOrder) {
-    // Each section announces on registration how many codes it wants.
-    CapturedLog log;
+    const CapturedLog log;
     const UTRANClassIndex index;
-    EXPECT_THAT(log.textsAt(LogPriority::Warning),
-                ElementsAre("Array Count: 1", "Array Count: 2", "Array Count: 1", "Array Count: 1",
-                            "Array Count: 1", "Array Count: 1", "Array Count: 1", "Array Count: 1"));
-    EXPECT_EQ(log.lines().size(), 8u);
+    expectCodeCounts(log, {1, 2, 1, 1, 1, 1, 1, 1});
 }
 
 TEST(UTRANClassIndex, PrintsTheCommonLineAloneWhenItGoes) {
-    std::FILE* printed = std::tmpfile();
-    ASSERT_NE(printed, nullptr);
-    std::FILE* earlier = redirectConsole(printed);
-    { const UTRANClassIndex index; }
-    redirectConsole(earlier);
-    std::rewind(printed);
-    char text[200] = {};
-    const std::size_t length = std::fread(text, 1, sizeof text, printed);
-    std::fclose(printed);
-    EXPECT_EQ(std::string(text, length), "Deallocing ClassIndex\n");
+    EXPECT_EQ(printedBy([] { const UTRANClassIndex index; }), "Deallocing ClassIndex\n");
 }
 
 } // namespace

@@ -1,63 +1,21 @@
 #include "LogGenerator/UTRAN/UTRANLogGenerator.h"
 
 #include "Platform/TelephonyService.h"
-#include "Tests/LogGenerator/OstrelGSM/SectionHarness.h"
-#include "Tests/Support/FakeClock.h"
-#include "Tests/Support/FakeResources.h"
+#include "Tests/LogGenerator/DecoderFixture.h"
 #include "Tests/Support/Hex.h"
 
 #include <gmock/gmock.h>
-
-#include <algorithm>
-#include <fstream>
-#include <iterator>
 
 namespace velmora {
 
 namespace {
 
-using testing::ElementsAre;
 using testing::IsEmpty;
 using testing::MatchesRegex;
 
-/// The display template that is shipped.
-Data templateFile() {
-    std::ifstream file(VELMORA_SOURCE_DIR "/Resources/Ostrel_UTRAN.plist", std::ios::binary);
-    return Data(std::vector<std::uint8_t>(std::istreambuf_iterator<char>(file), {}));
-}
-
-std::vector<std::int64_t> numbers(const Value& list) {
-    std::vector<std::int64_t> result;
-    for (const Value& number : *list.asArray())
-        result.push_back(*number.asInteger());
-    std::sort(result.begin(), result.end());
-    return result;
-}
-
-class UTRANGenerator : public testing::Test {
+class UTRANGenerator : public DecoderFixture {
 protected:
-    UTRANGenerator() {
-        // Builds the display, so that later log lines are the sections' alone.
-        generator->updateState(state, recordWith(0x0001, 13));
-    }
-
-    LogLines update(const Data& record) {
-        CapturedLog log;
-        generator->updateState(state, record);
-        return log.lines();
-    }
-    [[nodiscard]] std::string display() const { return shown(state["Display"]); }
-
-    FakeClock clock;
-    FakeResources resources;
-    std::unique_ptr<LogGenerator> generator = makeGenerator();
-    Dictionary state;
-
-private:
-    std::unique_ptr<LogGenerator> makeGenerator() {
-        resources.put("Ostrel_UTRAN", "plist", templateFile());
-        return LogGenerator::generatorFromTechnology(kVoxLogChannelTechnology_Ostrel_UTRAN2, clock);
-    }
+    UTRANGenerator() : DecoderFixture("Ostrel_UTRAN", kVoxLogChannelTechnology_Ostrel_UTRAN2) {}
 };
 
 TEST_F(UTRANGenerator, SaysEachStepOfItsCreationInOrder) {
@@ -79,20 +37,14 @@ TEST_F(UTRANGenerator, SaysEachStepOfItsCreationInOrder) {
 
 TEST_F(UTRANGenerator, IsTheTechnologysDecoderAndGoesWithTheCommonLineAlone) {
     ASSERT_NE(dynamic_cast<UTRANLogGenerator*>(generator.get()), nullptr);
-    char address[40];
-    std::snprintf(address, sizeof address, "%p", static_cast<void*>(generator.get()));
+    const LogLines expected = destructionLines({"Ostrel_GSMLogGenerator"}, generator.get());
     CapturedLog log;
     generator.reset();
-    EXPECT_EQ(log.lines(), (LogLines{{LogPriority::Warning,
-                                      "Ostrel_GSMLogGenerator is destructed " + std::string(address)}}));
+    EXPECT_EQ(log.lines(), expected);
 }
 
 TEST_F(UTRANGenerator, AsksForTheCodesOfItsSections) {
-    const DictionaryRef command = generator->getStartCommand();
-    EXPECT_EQ(command->size(), 3u);
-    EXPECT_EQ((*command)["SetState"], Value("Streaming"));
-    EXPECT_THAT(numbers((*command)["SetOstrelLogCodes"]), ElementsAre(53258, 53260, 53262, 53472, 53474));
-    EXPECT_THAT(numbers((*command)["SetVoxExtraCodes"]), ElementsAre(0, 1, 2));
+    expectStartCommand({53258, 53260, 53262, 53472, 53474});
 }
 
 TEST_F(UTRANGenerator, ARecordReachesItsSectionsInOrder) {

@@ -12,8 +12,7 @@
 #include <string_view>
 #include <vector>
 
-/// What the tests of this technology's sections share: a section with a node of its own, that node as text,
-/// and the records.
+/// What the tests of sections share: a section with a node of its own, that node as text, and the records.
 
 namespace velmora {
 

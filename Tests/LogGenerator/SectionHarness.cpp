@@ -1,4 +1,4 @@
-#include "Tests/LogGenerator/OstrelGSM/SectionHarness.h"
+#include "Tests/LogGenerator/SectionHarness.h"
 
 #include "Tests/Support/Hex.h"
 

@@ -1,0 +1,21 @@
+#pragma once
+
+#include <algorithm>
+#include <vector>
+
+namespace velmora {
+
+/// What the serving cell measures in this list of the receiver's; the cell at the receiver's limit where it
+/// is not in it.
+template <class Measurement>
+[[nodiscard]] Measurement measuredAnew(const Measurement& serving, const std::vector<Measurement>& list) {
+    const auto found = std::find_if(list.begin(), list.end(),
+                                    [&](const Measurement& each) { return each.cell == serving.cell; });
+    if (found != list.end())
+        return *found;
+    Measurement lost;
+    lost.cell = serving.cell;
+    return lost;
+}
+
+} // namespace velmora
