@@ -1,10 +1,10 @@
 #include "Platform/Linux/FileResources.h"
 
 #include "Platform/Linux/BuildStamp.h"
+#include "Platform/Linux/EnvironmentPath.h"
 #include "Platform/Linux/Files.h"
 
 #include <algorithm>
-#include <cstdlib>
 #include <set>
 #include <system_error>
 #include <utility>
@@ -14,11 +14,6 @@ namespace velmora {
 namespace {
 
 constexpr std::size_t maximumResourceSize = std::size_t{64} << 20;
-
-std::filesystem::path environmentPath(const char* variable) {
-    const char* value = std::getenv(variable);
-    return value ? value : "";
-}
 
 } // namespace
 

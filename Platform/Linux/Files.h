@@ -16,4 +16,8 @@ Result<Data> readFile(const std::filesystem::path& path, std::size_t maximumByte
 /// failure leaves what was written up to then. The reason is as readFile's.
 Result<Done> writeFile(const std::filesystem::path& path, Bytes content);
 
+/// Makes the file, or puts a new one with its permissions in its place, in one step: who reads it meanwhile
+/// sees the old or the new content, and so does whoever comes after a failure. The reason is as readFile's.
+Result<Done> replaceFile(const std::filesystem::path& path, Bytes content);
+
 } // namespace velmora

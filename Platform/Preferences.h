@@ -1,0 +1,20 @@
+#pragma once
+
+#include <string_view>
+
+namespace velmora {
+
+/// The preferences of another process, each a value under a key of that process's domain
+/// ("com.velmora.HomeScreen"). What cannot be done is an error line in the log. Main thread only.
+class Preferences {
+public:
+    virtual ~Preferences() = default;
+    /// Sets the value for this process; others see it from `synchronize` on.
+    virtual void setBoolean(std::string_view domain, std::string_view key, bool value) = 0;
+    /// Writes what was set in the domain to where its process reads it; everything else there stays.
+    virtual void synchronize(std::string_view domain) = 0;
+    /// Tells whoever listens that the value changed, so that it is picked up at once.
+    virtual void announceChange(std::string_view domain, std::string_view key) = 0;
+};
+
+} // namespace velmora
