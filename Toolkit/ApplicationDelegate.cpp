@@ -1,0 +1,7 @@
+#include "Toolkit/ApplicationDelegate.h"
+
+namespace velmora {
+
+void ApplicationDelegate::applicationWillTerminate(Application& /*application*/) {}
+
+} // namespace velmora

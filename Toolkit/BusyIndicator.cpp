@@ -1,0 +1,20 @@
+#include "Toolkit/BusyIndicator.h"
+
+namespace velmora {
+
+void BusyIndicator::startAnimating() {
+    _isAnimating = true;
+    changed();
+}
+
+void BusyIndicator::stopAnimating() {
+    _isAnimating = false;
+    changed();
+}
+
+void BusyIndicator::setHidesWhenStopped(bool hides) {
+    _hidesWhenStopped = hides;
+    changed();
+}
+
+} // namespace velmora

@@ -1,0 +1,48 @@
+#include "Toolkit/TextField.h"
+
+#include "Toolkit/TextFieldDelegate.h"
+#include "Toolkit/Widgets/Conversions.h"
+
+#include <QLineEdit>
+
+#include <algorithm>
+
+namespace velmora {
+
+class TextField::Widget : public QLineEdit {};
+
+TextField::TextField() : View(new Widget), _field(static_cast<Widget*>(widget())) {
+    _field->setObjectName("velmora.textField");
+    QObject::connect(_field, &QLineEdit::returnPressed, _field, [this] {
+        if (_delegate)
+            (void)_delegate->textFieldShouldReturn(*this);
+    });
+}
+
+TextField::~TextField() {
+    _field->disconnect();
+}
+
+std::string TextField::text() const {
+    return fromQt(_field->text());
+}
+
+void TextField::setText(std::string_view text) {
+    _field->setText(toQt(text));
+}
+
+void TextField::setPlaceholder(std::string_view text) {
+    _field->setPlaceholderText(toQt(text));
+    setAccessibleName(text);
+}
+
+void TextField::setDelegate(TextFieldDelegate* delegate) {
+    _delegate = delegate;
+}
+
+void TextField::sizeToFit() {
+    setFrame({frame().x, frame().y, frame().width,
+              std::max(44.0, static_cast<double>(_field->sizeHint().height()))});
+}
+
+} // namespace velmora

@@ -1,0 +1,15 @@
+#pragma once
+
+namespace velmora {
+
+class TextField;
+
+/// Answers for a text field. Outlives the field, or takes itself off it.
+class TextFieldDelegate {
+public:
+    virtual ~TextFieldDelegate() = default;
+    /// The return key was pressed. True lets the field do what it does on return (nothing more, at present).
+    virtual bool textFieldShouldReturn(TextField& textField) = 0;
+};
+
+} // namespace velmora

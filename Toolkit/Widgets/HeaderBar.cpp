@@ -1,0 +1,119 @@
+#include "Toolkit/Widgets/HeaderBar.h"
+
+#include "Toolkit/Widgets/Conversions.h"
+
+#include <QFontMetricsF>
+#include <QKeyEvent>
+#include <QPainter>
+#include <QPainterPath>
+#include <QStyle>
+#include <QStyleOptionFocusRect>
+
+#include <algorithm>
+#include <cmath>
+
+namespace velmora {
+
+namespace {
+
+constexpr int chevronWidth = 22;
+
+} // namespace
+
+BackButton::BackButton(QWidget* parent) : QAbstractButton(parent) {
+    setObjectName("velmora.back");
+    setFont(toQt(Font::systemFontOfSize(15)));
+    setFocusPolicy(Qt::TabFocus);
+    setAttribute(Qt::WA_Hover);
+}
+
+QSize BackButton::sizeHint() const {
+    const double advance = QFontMetricsF(font()).horizontalAdvance(text());
+    return {std::max(static_cast<int>(std::ceil(advance)) + chevronWidth + 8, 44), 44};
+}
+
+void BackButton::paintEvent(QPaintEvent* /*event*/) {
+    QPainter painter(this);
+    QColor ink = palette().color(QPalette::WindowText);
+    if (isDown() || underMouse()) {
+        QColor ground = ink;
+        ground.setAlphaF(isDown() ? 0.16F : 0.08F);
+        painter.fillRect(rect(), ground);
+    }
+    const double middle = height() / 2.0;
+    QPainterPath chevron;
+    chevron.moveTo(14, middle - 7);
+    chevron.lineTo(7, middle);
+    chevron.lineTo(14, middle + 7);
+    painter.setRenderHint(QPainter::Antialiasing);
+    painter.setPen(QPen(ink, 2, Qt::SolidLine, Qt::RoundCap, Qt::RoundJoin));
+    painter.drawPath(chevron);
+    painter.setPen(ink);
+    const QRect room = rect().adjusted(chevronWidth, 0, -4, 0);
+    painter.drawText(room, static_cast<int>(Qt::AlignLeft | Qt::AlignVCenter) | Qt::TextSingleLine,
+                     QFontMetricsF(font()).elidedText(text(), Qt::ElideRight, room.width()));
+    if (hasFocus()) {
+        QStyleOptionFocusRect option;
+        option.initFrom(this);
+        option.backgroundColor = palette().color(QPalette::Window);
+        option.state |= QStyle::State_KeyboardFocusChange;
+        style()->drawPrimitive(QStyle::PE_FrameFocusRect, &option, &painter, this);
+    }
+}
+
+void BackButton::keyPressEvent(QKeyEvent* event) {
+    if (event->key() == Qt::Key_Return || event->key() == Qt::Key_Enter)
+        click();
+    else
+        QAbstractButton::keyPressEvent(event);
+}
+
+HeaderBar::HeaderBar() : _back(new BackButton(this)), _title(new HeadingLabel) {
+    setObjectName("velmora.header");
+    setAutoFillBackground(true);
+    _title->setParent(this);
+    _title->setObjectName("velmora.title");
+    _title->setFont(toQt(Font::boldSystemFontOfSize(17)));
+    _title->setAlignment(Qt::AlignCenter);
+    _title->setElideMode(Qt::ElideMiddle);
+    _back->hide();
+}
+
+void HeaderBar::setTitle(const QString& title) {
+    _title->setText(title);
+    _title->setAccessibleName(title);
+    layoutParts();
+}
+
+void HeaderBar::setBack(bool isShown, const QString& title) {
+    _back->setText(title);
+    _back->setAccessibleName(title.isEmpty() ? tr("Back") : tr("Back to %1").arg(title));
+    _back->setVisible(isShown);
+    layoutParts();
+}
+
+void HeaderBar::layoutParts() {
+    // The way back has a third of the bar at most. The title is in the bar's middle when it fits there,
+    // beside the way back otherwise.
+    const int back = _back->isHidden() ? 0 : std::min(_back->sizeHint().width(), std::max(width() / 3, 44));
+    _back->setGeometry(4, (height() - 44) / 2, back, 44);
+    const int left = back > 0 ? back + 12 : 12;
+    const int wanted = _title->sizeHint().width();
+    const int room = std::max(width() - left - 12, 0);
+    const int middle = (width() - wanted) / 2;
+    const bool fits = middle >= left;
+    _title->setGeometry(fits ? middle : left, 0, fits ? wanted : room, height());
+}
+
+void HeaderBar::paintEvent(QPaintEvent* /*event*/) {
+    QColor line = palette().color(QPalette::WindowText);
+    line.setAlphaF(0.22F);
+    const double hair = 1 / devicePixelRatioF();
+    QPainter(this).fillRect(QRectF(0, height() - hair, width(), hair), line);
+}
+
+void HeaderBar::resizeEvent(QResizeEvent* /*event*/) {
+    layoutParts();
+}
+
+} // namespace velmora

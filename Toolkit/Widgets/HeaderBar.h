@@ -1,0 +1,45 @@
+#pragma once
+
+#include "Toolkit/Widgets/LabelWidget.h"
+
+#include <QAbstractButton>
+#include <QWidget>
+
+namespace velmora {
+
+/// The way back: a chevron and the title of the screen below, as far as there is room.
+class BackButton : public QAbstractButton {
+public:
+    explicit BackButton(QWidget* parent);
+    [[nodiscard]] QSize sizeHint() const override;
+
+protected:
+    void paintEvent(QPaintEvent* event) override;
+    void keyPressEvent(QKeyEvent* event) override;
+};
+
+/// The title of a screen, which a screen reader takes for a heading.
+class HeadingLabel : public LabelWidget {};
+
+/// The bar on top of a navigation stack.
+class HeaderBar : public QWidget {
+public:
+    HeaderBar();
+
+    [[nodiscard]] BackButton& backButton() { return *_back; }
+    void setTitle(const QString& title);
+    /// Shows the way back to a screen of that title.
+    void setBack(bool isShown, const QString& title);
+
+protected:
+    void paintEvent(QPaintEvent* event) override;
+    void resizeEvent(QResizeEvent* event) override;
+
+private:
+    void layoutParts();
+
+    BackButton* _back;
+    HeadingLabel* _title;
+};
+
+} // namespace velmora

@@ -1,0 +1,42 @@
+#pragma once
+
+#include "Toolkit/View.h"
+#include "Toolkit/ViewController.h"
+#include "Toolkit/Widgets/Motion.h"
+#include "Toolkit/Widgets/SheetWidget.h"
+#include "Toolkit/Widgets/WindowWidget.h"
+
+#include <QPointer>
+
+#include <memory>
+
+namespace velmora {
+
+/// A screen on a sheet over a window. Lives until the sheet is out of sight, and holds the screen as long.
+class ModalPresentation : public std::enable_shared_from_this<ModalPresentation> {
+public:
+    ModalPresentation(WindowWidget& window, std::shared_ptr<ViewController> viewController);
+    ~ModalPresentation();
+    ModalPresentation(const ModalPresentation&) = delete;
+    ModalPresentation& operator=(const ModalPresentation&) = delete;
+
+    [[nodiscard]] const std::shared_ptr<ViewController>& viewController() const { return _viewController; }
+    void present(bool animated);
+    void dismiss(bool animated);
+    /// The presenter is going: takes the sheet away without notice to anyone.
+    void abandon();
+
+private:
+    void layout();
+    void removeSheet();
+
+    std::shared_ptr<ViewController> _viewController;
+    View _panel;
+    QPointer<WindowWidget> _window;
+    QPointer<SheetWidget> _sheet;
+    QPointer<QWidget> _focusBefore;
+    Motion _motion;
+    double _shown = 0;
+};
+
+} // namespace velmora

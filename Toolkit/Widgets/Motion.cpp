@@ -1,0 +1,72 @@
+#include "Toolkit/Widgets/Motion.h"
+
+#include <QApplication>
+#include <QEasingCurve>
+#include <QStyle>
+#include <QVariantAnimation>
+
+#include <utility>
+
+namespace velmora {
+
+namespace {
+
+constexpr int duration_ms = 250;
+
+} // namespace
+
+bool wantsMotion() {
+    const QByteArray asked = qgetenv("VELMORA_REDUCED_MOTION");
+    return (asked.isEmpty() || asked == "0") &&
+           QApplication::style()->styleHint(QStyle::SH_Widget_Animation_Duration) > 0;
+}
+
+Motion::~Motion() {
+    if (_animation) {
+        _animation->disconnect();
+        _animation->stop();
+        _animation->deleteLater();
+    }
+}
+
+void Motion::start(bool animated, Step step, std::function<void()> atEnd) {
+    finish();
+    _step = std::move(step);
+    _atEnd = std::move(atEnd);
+    auto* const animation = new QVariantAnimation;
+    _animation = animation;
+    if (!animated || !wantsMotion()) {
+        finish();
+        return;
+    }
+    _step(0);
+    animation->setStartValue(0.0);
+    animation->setEndValue(1.0);
+    animation->setDuration(duration_ms);
+    animation->setEasingCurve(QEasingCurve::OutCubic);
+    QObject::connect(animation, &QVariantAnimation::valueChanged, animation,
+                     [this](const QVariant& value) { _step(value.toDouble()); });
+    QObject::connect(animation, &QVariantAnimation::finished, animation, [this] { finish(); });
+    animation->start();
+}
+
+void Motion::finish() {
+    if (!_animation)
+        return;
+    QVariantAnimation* const animation = _animation;
+    _animation = nullptr;
+    animation->disconnect();
+    animation->stop();
+    animation->deleteLater();
+    const Step step = std::exchange(_step, nullptr);
+    const std::function<void()> atEnd = std::exchange(_atEnd, nullptr);
+    step(1);
+    if (atEnd)
+        atEnd();
+}
+
+bool Motion::isRunning() const {
+    return _animation != nullptr;
+}
+
+} // namespace velmora

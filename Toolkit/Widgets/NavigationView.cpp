@@ -1,0 +1,90 @@
+#include "Toolkit/Widgets/NavigationView.h"
+
+#include <QWidget>
+
+#include <algorithm>
+#include <cmath>
+#include <utility>
+
+namespace velmora {
+
+namespace {
+
+constexpr double barHeight = 52;
+
+} // namespace
+
+NavigationView::NavigationView() : _header(new HeaderBar), _toolbar(new Toolbar) {
+    widget()->setObjectName("velmora.navigation");
+    setBackgroundColor(Color::ground);
+    _header->setParent(widget());
+    addSubview(_container);
+    _toolbar->setParent(widget());
+    _toolbar->hide();
+}
+
+NavigationView::~NavigationView() = default;
+
+void NavigationView::setToolbarHidden(bool isHidden) {
+    _toolbar->setVisible(!isHidden);
+    layoutSubviews();
+}
+
+void NavigationView::showPane(View& pane, View* old, bool isPush, bool animated,
+                              std::function<void()> atEnd) {
+    finish();
+    if (_pane && _pane != &pane && _pane != old)
+        _pane->removeFromSuperview();
+    _pane = &pane;
+    _old = old == &pane ? nullptr : old;
+    _isPush = isPush;
+    _container.addSubview(pane);
+    pane.setFrame(_container.bounds());
+    if (_old) {
+        (isPush ? pane : *_old).widget()->raise();
+        _old->widget()->setAttribute(Qt::WA_TransparentForMouseEvents);
+    }
+    _motion.start(
+        animated && _old, [this](double part) { placePane(part); },
+        [this, ended = std::move(atEnd)] {
+            if (View* const gone = std::exchange(_old, nullptr)) {
+                gone->widget()->setAttribute(Qt::WA_TransparentForMouseEvents, false);
+                gone->removeFromSuperview();
+            }
+            ended();
+        });
+}
+
+void NavigationView::removePane() {
+    finish();
+    if (View* const gone = std::exchange(_pane, nullptr))
+        gone->removeFromSuperview();
+}
+
+void NavigationView::finish() {
+    _motion.finish();
+}
+
+/// The upper one of the two travels the whole width, the lower one a third of it.
+void NavigationView::placePane(double part) const {
+    const double width = bounds().width;
+    const auto put = [](const View* view, double x) {
+        if (view)
+            view->widget()->move(static_cast<int>(std::lround(x)), 0);
+    };
+    put(_pane, _isPush ? width * (1 - part) : width / 3 * (part - 1));
+    put(_old, _isPush ? width / 3 * -part : width * part);
+}
+
+void NavigationView::layoutSubviews() {
+    finish();
+    const double below = _toolbar->isHidden() ? 0 : barHeight;
+    const auto whole = [](double value) { return static_cast<int>(std::lround(value)); };
+    _header->setGeometry(0, 0, whole(bounds().width), whole(barHeight));
+    _toolbar->setGeometry(0, whole(bounds().height - below), whole(bounds().width), whole(barHeight));
+    _container.setFrame({0, barHeight, bounds().width, std::max(bounds().height - barHeight - below, 0.0)});
+    if (_pane)
+        _pane->setFrame(_container.bounds());
+}
+
+} // namespace velmora

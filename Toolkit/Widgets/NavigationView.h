@@ -1,0 +1,42 @@
+#pragma once
+
+#include "Toolkit/View.h"
+#include "Toolkit/Widgets/HeaderBar.h"
+#include "Toolkit/Widgets/Motion.h"
+#include "Toolkit/Widgets/Toolbar.h"
+
+namespace velmora {
+
+/// What a navigation stack looks like: header, pane, toolbar.
+class NavigationView : public View {
+public:
+    NavigationView();
+    ~NavigationView() override;
+
+    [[nodiscard]] HeaderBar& header() { return *_header; }
+    [[nodiscard]] Toolbar& toolbar() { return *_toolbar; }
+    void setToolbarHidden(bool isHidden);
+
+    /// Puts the pane in the old one's place (there may be none): from the right when it is pushed, uncovered
+    /// from the left otherwise. An earlier movement ends first.
+    void showPane(View& pane, View* old, bool isPush, bool animated, std::function<void()> atEnd);
+    /// Leaves the place empty.
+    void removePane();
+    /// Ends a movement under way.
+    void finish();
+
+    void layoutSubviews() override;
+
+private:
+    void placePane(double part) const;
+
+    HeaderBar* _header;
+    Toolbar* _toolbar;
+    View _container;
+    View* _pane = nullptr;
+    View* _old = nullptr;
+    bool _isPush = true;
+    Motion _motion;
+};
+
+} // namespace velmora

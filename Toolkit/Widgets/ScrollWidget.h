@@ -1,0 +1,36 @@
+#pragma once
+
+#include <QPointF>
+#include <QWidget>
+
+namespace velmora {
+
+/// A window on a wider content that moves sideways. In a table the table moves it under the finger, as one
+/// gesture may go either way there; elsewhere it does so itself.
+class ScrollWidget : public QWidget {
+public:
+    ScrollWidget();
+
+    [[nodiscard]] QWidget* content() const { return _content; }
+    void setContentSize(const QSizeF& size);
+    [[nodiscard]] QSizeF contentSize() const { return _size; }
+    [[nodiscard]] double offset() const { return _offset; }
+    void setOffset(double x);
+    [[nodiscard]] double maximumOffset() const;
+
+    /// The innermost one that can move at that place of `ancestor`, or null.
+    [[nodiscard]] static ScrollWidget* at(const QWidget& ancestor, const QPoint& place);
+
+protected:
+    bool event(QEvent* event) override;
+    void wheelEvent(QWheelEvent* event) override;
+    void resizeEvent(QResizeEvent* event) override;
+    void showEvent(QShowEvent* event) override;
+
+private:
+    QWidget* _content;
+    QSizeF _size;
+    double _offset = 0;
+};
+
+} // namespace velmora

@@ -1,0 +1,43 @@
+#pragma once
+
+#include <QPointF>
+#include <QPointer>
+
+#include <cstddef>
+#include <optional>
+
+class QEvent;
+class QKeyEvent;
+class QPoint;
+class QTouchEvent;
+
+namespace velmora {
+
+class ScrollWidget;
+class TableWidget;
+
+/// What fingers, mouse and keys do in a table. A finger's stroke moves the rows or, sideways, the row under
+/// it.
+class TableInput {
+public:
+    explicit TableInput(TableWidget& table);
+    ~TableInput();
+
+    /// An event of the viewport; true when it was used.
+    [[nodiscard]] bool handle(QEvent* event);
+    void handleKey(QKeyEvent* event);
+
+private:
+    void touch(const QTouchEvent& event);
+    [[nodiscard]] bool press(const QPoint& place);
+    [[nodiscard]] bool release(const QPoint& place);
+    void cancelPress();
+    [[nodiscard]] bool moveFocus(int key);
+    [[nodiscard]] bool scrollSideways(int direction);
+
+    TableWidget& _table;
+    std::optional<std::size_t> _pressed;
+    QPointer<ScrollWidget> _underFinger;
+};
+
+} // namespace velmora

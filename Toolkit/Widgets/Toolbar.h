@@ -1,0 +1,45 @@
+#pragma once
+
+#include "Toolkit/ToolbarItem.h"
+
+#include <QWidget>
+
+#include <memory>
+#include <vector>
+
+class QHBoxLayout;
+
+namespace velmora {
+
+/// The bar at the bottom of a navigation stack. Items that follow others of their kind take over what those
+/// have on the screen, so that a button keeps the keyboard and a half finished click.
+class Toolbar : public QWidget {
+public:
+    Toolbar();
+    ~Toolbar() override;
+
+    void setItems(const std::vector<std::shared_ptr<ToolbarItem>>& items);
+    /// Presses the Save button, if there is one.
+    void save();
+
+protected:
+    void paintEvent(QPaintEvent* event) override;
+
+private:
+    enum class Kind { busyIndicator, label, flexibleSpace, saveButton };
+    struct Place {
+        Kind kind;
+        std::shared_ptr<ToolbarItem> item;
+        QWidget* widget;
+    };
+
+    [[nodiscard]] static Kind kindOf(const ToolbarItem& item);
+    [[nodiscard]] QWidget* makeWidget(Kind kind);
+    [[nodiscard]] QWidget* takeWidget(std::vector<Place>& places, Kind kind);
+    static void fill(const Place& place);
+
+    std::vector<Place> _places;
+    QHBoxLayout* _layout;
+};
+
+} // namespace velmora

@@ -1,0 +1,63 @@
+#include "Toolkit/Widgets/WindowWidget.h"
+
+#include "Toolkit/Widgets/SheetWidget.h"
+
+#include <QApplication>
+#include <QKeyEvent>
+
+namespace velmora {
+
+WindowWidget::WindowWidget() {
+    setObjectName("velmora.window");
+    setMinimumSize(240, 320);
+}
+
+SheetWidget* WindowWidget::sheet() const {
+    SheetWidget* topmost = nullptr;
+    for (QObject* const child : children())
+        if (auto* const candidate = dynamic_cast<SheetWidget*>(child);
+            candidate && !candidate->isPassive() && !candidate->isHidden())
+            topmost = candidate;
+    return topmost;
+}
+
+void WindowWidget::returnFocus(QWidget* before) {
+    if (before && before->isVisible() && isAncestorOf(before))
+        before->setFocus(Qt::OtherFocusReason);
+    else if (onFocus)
+        onFocus();
+}
+
+WindowWidget* WindowWidget::main() {
+    if (auto* const active = dynamic_cast<WindowWidget*>(QApplication::activeWindow()))
+        return active;
+    for (QWidget* const widget : QApplication::topLevelWidgets())
+        if (auto* const window = dynamic_cast<WindowWidget*>(widget); window && window->isVisible())
+            return window;
+    return nullptr;
+}
+
+bool WindowWidget::isBackOrCancel(const QKeyEvent& event) {
+    return event.key() == Qt::Key_Back || event.matches(QKeySequence::Cancel) ||
+           (event.key() == Qt::Key_Left && event.modifiers() == Qt::AltModifier);
+}
+
+void WindowWidget::keyPressEvent(QKeyEvent* event) {
+    if (SheetWidget* const over = sheet()) { // nobody in it has the keyboard
+        QApplication::sendEvent(over, event);
+        return;
+    }
+    const std::function<void()> action = event->matches(QKeySequence::Save) ? onSave
+                                         : isBackOrCancel(*event)           ? onCancel
+                                                                            : std::function<void()>();
+    event->setAccepted(action != nullptr);
+    if (action)
+        action();
+}
+
+void WindowWidget::resizeEvent(QResizeEvent* /*event*/) {
+    if (onResize)
+        onResize();
+}
+
+} // namespace velmora

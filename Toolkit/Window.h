@@ -1,0 +1,47 @@
+#pragma once
+
+#include "Toolkit/Geometry.h"
+
+#include <memory>
+
+class QWidget;
+
+namespace velmora {
+
+class ViewController;
+
+/// A window of the program, filled by its root controller's view. Closing the last one ends the application's
+/// loop. Owned by whoever makes it; destroying it takes it off the screen.
+class Window {
+public:
+    /// Only the size of the frame counts: where windows go is the desktop's business, and on a device whose
+    /// windows fill the screen this one does.
+    explicit Window(const Rect& frame);
+    ~Window();
+    Window(const Window&) = delete;
+    Window& operator=(const Window&) = delete;
+
+    [[nodiscard]] std::shared_ptr<ViewController> rootViewController() const;
+    void setRootViewController(std::shared_ptr<ViewController> viewController);
+
+    /// Brings the window up with the keyboard in it; the root controller hears that it appears.
+    void makeKeyAndVisible();
+    [[nodiscard]] bool isHidden() const;
+    /// Takes the window off the screen, or puts it back.
+    void setHidden(bool isHidden);
+    /// The inside, from 0, 0.
+    [[nodiscard]] Rect bounds() const;
+
+    /// What draws the window, for the toolkit and its tests. Its parts are found by object name:
+    /// "velmora.header", "velmora.title", "velmora.back", "velmora.toolbar", "velmora.busy",
+    /// "velmora.status", "velmora.save", "velmora.table", "velmora.row", "velmora.sheet",
+    /// "velmora.textField", and "velmora.saveButton", "velmora.cancelButton", "velmora.button" by role;
+    /// "velmora.alert" is a window of its own.
+    [[nodiscard]] QWidget* widget() const;
+
+private:
+    class Impl;
+    std::unique_ptr<Impl> _impl;
+};
+
+} // namespace velmora
