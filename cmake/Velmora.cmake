@@ -49,9 +49,9 @@ endfunction()
 # that each header is known to compile alone.
 function(velmora_header_check)
     file(GLOB_RECURSE headers CONFIGURE_DEPENDS RELATIVE ${PROJECT_SOURCE_DIR}
-         ${PROJECT_SOURCE_DIR}/LogGenerator/*.h ${PROJECT_SOURCE_DIR}/Model/*.h ${PROJECT_SOURCE_DIR}/Platform/*.h
-         ${PROJECT_SOURCE_DIR}/Recording/*.h ${PROJECT_SOURCE_DIR}/Telephony/*.h ${PROJECT_SOURCE_DIR}/Tests/*.h
-         ${PROJECT_SOURCE_DIR}/Tools/*.h)
+         ${PROJECT_SOURCE_DIR}/App/*.h ${PROJECT_SOURCE_DIR}/LogGenerator/*.h ${PROJECT_SOURCE_DIR}/Model/*.h
+         ${PROJECT_SOURCE_DIR}/Platform/*.h ${PROJECT_SOURCE_DIR}/Recording/*.h ${PROJECT_SOURCE_DIR}/Telephony/*.h
+         ${PROJECT_SOURCE_DIR}/Tests/*.h ${PROJECT_SOURCE_DIR}/Toolkit/*.h ${PROJECT_SOURCE_DIR}/Tools/*.h)
     set(sources)
     foreach(header IN LISTS headers)
         string(REGEX REPLACE "\\.h$" ".cpp" source ${header})
@@ -62,6 +62,6 @@ function(velmora_header_check)
         endif()
     endforeach()
     add_library(header-check OBJECT ${sources})
-    target_link_libraries(header-check PRIVATE velmora_options velmora_tools velmora_telephony velmora_test_support
-                          GTest::gtest GTest::gmock)
+    target_link_libraries(header-check PRIVATE velmora_options velmora_app velmora_tools velmora_telephony
+                          velmora_test_support GTest::gtest GTest::gmock Qt6::Test Qt6::Widgets)
 endfunction()

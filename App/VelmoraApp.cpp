@@ -1,0 +1,118 @@
+#include "App/VelmoraApp.h"
+
+#include "App/VelmoraPaneController.h"
+#include "App/VelmoraSaveViewController.h"
+#include "Model/NodePath.h"
+#include "Toolkit/NavigationController.h"
+#include "Toolkit/Screen.h"
+#include "Toolkit/Window.h"
+
+#include <cstddef>
+#include <utility>
+#include <vector>
+
+namespace velmora {
+
+namespace {
+
+constexpr const char* internalInstallMarker =
+    "/QuorraInternal/Library/PreferenceBundles/Carrier Settings.bundle";
+constexpr const char* homeScreenDomain = "com.velmora.HomeScreen";
+constexpr const char* showGSMRSSIKey = "LantheShowGSMRSSI";
+constexpr const char* connecting = "Connecting...";
+
+} // namespace
+
+VelmoraApp::VelmoraApp(int& argc, char** argv, const PlatformMaker& makePlatform)
+    : Application(argc, argv), _platform(makePlatform()) {
+    setName("Velmora", "com.velmora.Velmora");
+}
+
+VelmoraApp::~VelmoraApp() {
+    // A retry that is due holds the model beyond this; the ports do not stay open for it.
+    if (_model)
+        _model->destroyPorts();
+}
+
+void VelmoraApp::applicationDidFinishLaunching(Application&) {
+    getSaveButtonPref();
+    _window = std::make_shared<Window>(Screen::mainBounds());
+    _model = std::make_shared<VelmoraModel>(_platform->model(), this);
+    setUpdateMessage(connecting);
+    _dateFormatter =
+        std::make_unique<DateFormatter>(_platform->model().clock, "'Updated' yyyy-MM-dd 'at' HH:mm:ss");
+    const auto rootPane = std::make_shared<VelmoraPaneController>(nullptr, std::string(rootNodePath), *this);
+    rootPane->setStatus("Connecting", true);
+    _navController = std::make_shared<NavigationController>(rootPane);
+    _navController->setDelegate(this);
+    _window->setRootViewController(_navController);
+    _window->makeKeyAndVisible();
+    // The screen is up before the first exchange with the telephony service, which blocks.
+    _platform->model().queue.async([model = _model] { model->restartMonitor(); });
+}
+
+void VelmoraApp::applicationWillTerminate() {
+    _setGSMRSSI(false);
+    setUpdateMessage({});
+    _dateFormatter.reset();
+    setSaveViewController(nullptr);
+    if (_window)
+        _window->setHidden(true);
+    setWindow(nullptr);
+    _model.reset();
+}
+
+void VelmoraApp::getSaveButtonPref() {
+    setAllowSaveButton(_platform->files().exists(internalInstallMarker));
+}
+
+void VelmoraApp::_setGSMRSSI(bool isShown) {
+    Preferences& preferences = _platform->preferences();
+    preferences.setBoolean(homeScreenDomain, showGSMRSSIKey, isShown);
+    preferences.synchronize(homeScreenDomain);
+    preferences.announceChange(homeScreenDomain, showGSMRSSIKey);
+}
+
+void VelmoraApp::showSaveView() {
+    if (_saveViewController)
+        return;
+    _saveViewController = std::make_shared<VelmoraSaveViewController>(_model->getSaveContents(), *this);
+    _navController->presentModalViewController(_saveViewController, true);
+}
+
+void VelmoraApp::closeSaveView() {
+    if (!_saveViewController)
+        return;
+    _navController->dismissModalViewController(true);
+    _saveViewController.reset();
+}
+
+void VelmoraApp::updateStatusForViewController(VelmoraPaneController& pane) {
+    if (_model->isConnected())
+        pane.setStatus(updateMessage(), false);
+    else
+        pane.setStatus(connecting, true);
+}
+
+void VelmoraApp::updateViewControllerFromModel() {
+    // Only panes are ever put on the stack. Popping changes it, so it is walked as it stood.
+    const std::vector<std::shared_ptr<ViewController>> panes = _navController->viewControllers();
+    for (std::size_t i = 0; i < panes.size(); ++i) {
+        auto& pane = static_cast<VelmoraPaneController&>(*panes[i]);
+        NodeRef node = i == 0 ? _model->topLevelNodes() : _model->nodeAtPath(pane.path());
+        if (i > 0 && !node) {
+            _navController->popToViewController(*panes[i - 1], true);
+            break;
+        }
+        pane.reloadWithNode(std::move(node));
+    }
+    if (_model->isConnected())
+        setUpdateMessage(_dateFormatter->stringFromDate(_platform->model().clock.now()));
+    updateStatusForViewController(static_cast<VelmoraPaneController&>(*_navController->topViewController()));
+}
+
+void VelmoraApp::willShowViewController(NavigationController&, ViewController& viewController, bool) {
+    updateStatusForViewController(static_cast<VelmoraPaneController&>(viewController));
+}
+
+} // namespace velmora

@@ -1,0 +1,102 @@
+#pragma once
+
+#include "App/AppPlatform.h"
+#include "App/DateFormatter.h"
+#include "Model/VelmoraModel.h"
+#include "Toolkit/Application.h"
+#include "Toolkit/ApplicationDelegate.h"
+#include "Toolkit/NavigationControllerDelegate.h"
+
+#include <functional>
+#include <memory>
+#include <string>
+#include <utility>
+
+namespace velmora {
+
+class NavigationController;
+class VelmoraPaneController;
+class VelmoraSaveViewController;
+class Window;
+
+/// The application object and its own delegate: it brings the screens up, starts the model, and from then on
+/// is the bridge between the two. It owns the platform, the window, the stack of panes and the model, and
+/// outlives everything else but the log and the resources. One a process, like its base. Main thread only.
+class VelmoraApp final : public Application,
+                         public ApplicationDelegate,
+                         public NavigationControllerDelegate,
+                         public ModelObserver {
+public:
+    using PlatformMaker = std::function<std::unique_ptr<AppPlatform>()>;
+
+    /// `makePlatform` is called once the event loop is there for the platform to stand on.
+    VelmoraApp(int& argc, char** argv, const PlatformMaker& makePlatform);
+    ~VelmoraApp() override;
+
+    /// Runs the application's loop with this object as the delegate; returns as its base's does.
+    using Application::run;
+    [[nodiscard]] int run() { return run(*this); }
+
+    void applicationDidFinishLaunching(Application& application) override;
+    /// Has no argument, so the toolkit's notice never reaches it, and nothing else calls it: the preference
+    /// is not reset at exit. That is meant.
+    void applicationWillTerminate();
+    /// The toolkit's notice does nothing here.
+    using ApplicationDelegate::applicationWillTerminate;
+
+    /// Panes offer the save button on internal installs alone.
+    void getSaveButtonPref();
+    /// Switches the home screen's display of the received signal strength.
+    void _setGSMRSSI(bool isShown);
+
+    /// Opens the save screen; nothing while there is one.
+    void showSaveView();
+    /// Closes the save screen; nothing without one.
+    void closeSaveView();
+
+    void updateStatusForViewController(VelmoraPaneController& pane);
+    void updateViewControllerFromModel() override;
+    void willShowViewController(NavigationController& navigationController, ViewController& viewController,
+                                bool animated) override;
+
+    // Properties; their storage is their own, not the fields of like name.
+    [[nodiscard]] bool allowSaveButton() const { return _properties.allowSaveButton; }
+    void setAllowSaveButton(bool isAllowed) { _properties.allowSaveButton = isAllowed; }
+    [[nodiscard]] const std::shared_ptr<VelmoraSaveViewController>& saveViewController() const {
+        return _properties.saveViewController;
+    }
+    void setSaveViewController(std::shared_ptr<VelmoraSaveViewController> controller) {
+        _properties.saveViewController = std::move(controller);
+    }
+    [[nodiscard]] const std::shared_ptr<Window>& window() const { return _properties.window; }
+    void setWindow(std::shared_ptr<Window> window) { _properties.window = std::move(window); }
+    /// The status shown while connected.
+    [[nodiscard]] const std::string& updateMessage() const { return _properties.updateMessage; }
+    void setUpdateMessage(std::string message) { _properties.updateMessage = std::move(message); }
+
+    /// Precondition for both: the application has launched.
+    [[nodiscard]] NavigationController& navController() const { return *_navController; }
+    [[nodiscard]] const VelmoraModel& model() const { return *_model; }
+    [[nodiscard]] AppPlatform& platform() const { return *_platform; }
+
+private:
+    struct Properties {
+        bool allowSaveButton = false;
+        std::shared_ptr<VelmoraSaveViewController> saveViewController;
+        std::shared_ptr<Window> window;
+        std::string updateMessage;
+    };
+
+    std::unique_ptr<AppPlatform> _platform;
+
+    std::shared_ptr<Window> _window;
+    std::shared_ptr<NavigationController> _navController;
+    std::shared_ptr<VelmoraSaveViewController> _saveViewController;
+    std::shared_ptr<VelmoraModel> _model;
+    [[maybe_unused]] bool _allowSaveButton = false; ///< unused: the property has the flag
+    std::unique_ptr<DateFormatter> _dateFormatter;
+    [[maybe_unused]] std::string _updateMessage; ///< unused: the property has the text
+    Properties _properties;
+};
+
+} // namespace velmora

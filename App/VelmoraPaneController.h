@@ -1,0 +1,53 @@
+#pragma once
+
+#include "Model/VelmoraModelNode.h"
+#include "Toolkit/TableViewController.h"
+
+#include <optional>
+#include <string>
+#include <string_view>
+
+namespace velmora {
+
+class VelmoraApp;
+
+/// A measurement pane: the children of one node of the display tree as rows, and below them a toolbar with
+/// the status. It remembers its node's path, by which the application object gives it the fresh node after
+/// every redraw; nodes of an older tree live on as long as a pane shows them. The navigation stack owns it.
+/// Main thread only.
+class VelmoraPaneController final : public TableViewController {
+public:
+    /// `node` may be null. `app` must outlive the pane.
+    VelmoraPaneController(NodeRef node, std::string path, VelmoraApp& app);
+
+    [[nodiscard]] const std::string& path() const { return _keyPath; }
+
+    void viewWillAppear(bool animated) override;
+    /// Only gives the keyboard up. The base does not hear of it; that is meant.
+    void viewWillDisappear(bool animated) override;
+
+    /// Shows the status (an absent one as an empty text), and whether something is under way.
+    void setStatus(std::optional<std::string_view> status, bool isLoading);
+    /// Shows another node (or none) under the same path.
+    void reloadWithNode(NodeRef node);
+    /// Makes the toolbar from scratch.
+    void createToolbarItems();
+
+    [[nodiscard]] std::size_t numberOfRowsInSection(TableView& tableView, std::size_t section) override;
+    [[nodiscard]] std::shared_ptr<TableCell> cellForRowAtIndexPath(TableView& tableView,
+                                                                   const IndexPath& indexPath) override;
+    void didSelectRowAtIndexPath(TableView& tableView, const IndexPath& indexPath) override;
+
+private:
+    /// The row's node. Precondition: there is such a row.
+    [[nodiscard]] const NodeRef& nodeAt(const IndexPath& indexPath) const;
+    void resetTitle();
+
+    NodeRef _nodes;
+    std::string _keyPath;
+    std::string _status;
+    bool _isLoading = true;
+    VelmoraApp& _app;
+};
+
+} // namespace velmora

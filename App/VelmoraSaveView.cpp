@@ -1,0 +1,51 @@
+#include "App/VelmoraSaveView.h"
+
+#include <algorithm>
+
+namespace velmora {
+
+namespace {
+
+constexpr double margin = 12;
+constexpr double headingSize = 17;
+
+} // namespace
+
+VelmoraSaveView::VelmoraSaveView(TableView& list, TextField& description)
+    : _list(list), _description(description), _heading("Save Snapshot"),
+      _cancel("Cancel", ButtonRole::cancel), _save("Save", ButtonRole::save) {
+    setBackgroundColor(Color::ground);
+    _heading.setFont(Font::boldSystemFontOfSize(headingSize));
+    _heading.setTextAlignment(TextAlignment::center);
+    _description.setPlaceholder("Description");
+    _list.setAccessibleName("What is saved");
+    for (View* part :
+         {static_cast<View*>(&_cancel), static_cast<View*>(&_heading), static_cast<View*>(&_save),
+          static_cast<View*>(&_description), static_cast<View*>(&_list)})
+        addSubview(*part);
+}
+
+void VelmoraSaveView::layoutSubviews() {
+    const auto [x, y, width, height] = bounds();
+    _cancel.sizeToFit();
+    _save.sizeToFit();
+    _description.sizeToFit();
+    const Size cancel = _cancel.bounds().size();
+    const Size save = _save.bounds().size();
+    const double rowHeight = std::max(cancel.height, save.height);
+    const double side = std::max(cancel.width, save.width) + 2 * margin;
+    _cancel.setFrame({x + margin, y + margin, cancel.width, rowHeight});
+    _save.setFrame({x + width - margin - save.width, y + margin, save.width, rowHeight});
+    // As wide on both sides, so that it stands in the middle.
+    _heading.setFrame({x + side, y + margin, std::max(0.0, width - 2 * side), rowHeight});
+
+    const double fieldTop = y + margin + rowHeight + margin;
+    const double fieldHeight = _description.bounds().height;
+    _description.setFrame({x + margin, fieldTop, width - 2 * margin, fieldHeight});
+
+    const double listTop = fieldTop + fieldHeight + margin;
+    _list.setFrame({x, listTop, width, std::max(0.0, y + height - listTop)});
+    _list.sizeToFit();
+}
+
+} // namespace velmora

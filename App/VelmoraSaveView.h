@@ -1,0 +1,31 @@
+#pragma once
+
+#include "Toolkit/Button.h"
+#include "Toolkit/Label.h"
+#include "Toolkit/TableView.h"
+#include "Toolkit/TextField.h"
+#include "Toolkit/View.h"
+
+namespace velmora {
+
+/// The save screen's layout: Cancel, a heading and Save in a row, below them the description field, below
+/// that the list, and around all a background. Main thread only.
+class VelmoraSaveView final : public View {
+public:
+    /// The list and the field are the screen's; they leave this view when they end.
+    VelmoraSaveView(TableView& list, TextField& description);
+
+    [[nodiscard]] Button& saveButton() { return _save; }
+    [[nodiscard]] Button& cancelButton() { return _cancel; }
+
+    void layoutSubviews() override;
+
+private:
+    TableView& _list;
+    TextField& _description;
+    Label _heading;
+    Button _cancel;
+    Button _save;
+};
+
+} // namespace velmora

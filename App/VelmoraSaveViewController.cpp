@@ -1,0 +1,145 @@
+#include "App/VelmoraSaveViewController.h"
+
+#include "App/VelmoraApp.h"
+#include "App/VelmoraSaveView.h"
+#include "Platform/PropertyList.h"
+#include "Platform/SystemLog.h"
+#include "Toolkit/Alert.h"
+#include "Toolkit/Screen.h"
+#include "Toolkit/TableCell.h"
+
+#include <chrono>
+#include <initializer_list>
+#include <utility>
+
+namespace velmora {
+
+namespace {
+
+constexpr const char* cellIdentifier = "SaveHistoryContentCell";
+constexpr double cellFontSize = 13;
+
+/// A dictionary of the pairs in their order, which ends before the first whose value is missing.
+DictionaryRef dictionaryOfPairs(std::initializer_list<Dictionary::Entry> pairs) {
+    const auto dictionary = makeDictionary();
+    for (const auto& [key, value] : pairs) {
+        if (value.isNone())
+            break;
+        dictionary->set(key, value);
+    }
+    return dictionary;
+}
+
+} // namespace
+
+VelmoraSaveViewController::VelmoraSaveViewController(const ArrayRef& saveHistory, VelmoraApp& app)
+    : _timeStamp(app.platform().model().clock.now()),
+      _saveHistory(saveHistory ? Value(saveHistory).copy().arrayRef() : nullptr), _app(app) {}
+
+VelmoraSaveViewController::~VelmoraSaveViewController() = default;
+
+std::unique_ptr<View> VelmoraSaveViewController::loadView() {
+    auto view = std::make_unique<VelmoraSaveView>(_saveContentTable, _saveDescription);
+    view->saveButton().setAction([this] { savePressed(); });
+    view->cancelButton().setAction([this] { cancelPressed(); });
+    view->setOnTap([this] { backgroundTouched(); });
+    _saveContentTable.setDataSource(this);
+    _saveContentTable.setDelegate(this);
+    _saveContentTable.reloadData();
+    view->setFrame(Screen::mainApplicationFrame());
+    return view;
+}
+
+void VelmoraSaveViewController::viewDidLoad() {
+    _saveDescription.setDelegate(this);
+    ViewController::viewDidLoad();
+    _saveContentTable.sizeToFit();
+}
+
+void VelmoraSaveViewController::viewWillAppear(bool) {
+    view().setFrame(Screen::mainApplicationFrame());
+}
+
+void VelmoraSaveViewController::didReceiveMemoryWarning() {
+    ViewController::didReceiveMemoryWarning();
+}
+
+void VelmoraSaveViewController::viewDidUnload() {
+    ViewController::viewDidUnload();
+}
+
+DictionaryRef VelmoraSaveViewController::snapshot() const {
+    // Without a decoder there is no data, and so neither data nor what comes after it.
+    return dictionaryOfPairs({{"Timestamp", dateDescription(_timeStamp)},
+                              {"Data", _saveHistory ? Value(_saveHistory) : Value()},
+                              {"Description", _saveDescription.text()}});
+}
+
+std::string VelmoraSaveViewController::snapshotPath() const {
+    // By the second, so that a second save within it replaces the first.
+    const auto now = std::chrono::floor<std::chrono::seconds>(_app.platform().model().clock.now());
+    return _app.platform().files().diagnosticLogDirectory() + "/VelmoraSnapshot-" +
+           std::to_string(now.time_since_epoch().count()) + ".velmora";
+}
+
+bool VelmoraSaveViewController::writeSnapshot(const std::string& path) const {
+    const auto list = writeXMLPropertyList(snapshot());
+    const auto written = list ? _app.platform().files().writeDirectly(path, *list) : Failure{list.reason()};
+    if (!written)
+        logFormat(LogPriority::Info, "Snapshot: %s", written.reason().c_str());
+    return static_cast<bool>(written);
+}
+
+void VelmoraSaveViewController::savePressed() {
+    const std::string path = snapshotPath();
+    if (!writeSnapshot(path)) {
+        logFormat(LogPriority::Error, "Unable to write snapshot to %s", path.c_str());
+        Alert("File Error", "Unable to write file to disk", "Close").show();
+    }
+    // In both cases: a failure leaves only the notice.
+    queueClosing();
+}
+
+void VelmoraSaveViewController::cancelPressed() {
+    queueClosing();
+}
+
+void VelmoraSaveViewController::queueClosing() {
+    _app.platform().model().queue.async([&app = _app] { app.closeSaveView(); });
+}
+
+bool VelmoraSaveViewController::textFieldShouldReturn(TextField& textField) {
+    textField.resignFirstResponder();
+    return true;
+}
+
+void VelmoraSaveViewController::backgroundTouched() {
+    _saveDescription.resignFirstResponder();
+}
+
+std::size_t VelmoraSaveViewController::numberOfSections(TableView&) {
+    return 1;
+}
+
+std::size_t VelmoraSaveViewController::numberOfRowsInSection(TableView&, std::size_t) {
+    return _saveHistory ? _saveHistory->size() : 0;
+}
+
+std::shared_ptr<TableCell> VelmoraSaveViewController::cellForRowAtIndexPath(TableView& tableView,
+                                                                            const IndexPath& indexPath) {
+    auto cell = tableView.dequeueReusableCell(cellIdentifier);
+    if (!cell)
+        cell = std::make_shared<TableCell>(TableCellStyle::plain, cellIdentifier);
+    const Dictionary* entry = (*_saveHistory)[indexPath.row()].asDictionary();
+    const std::string* description = entry ? (*entry)["Description"].asString() : nullptr;
+    cell->textLabel().setText(description ? std::string_view(*description) : std::string_view());
+    cell->textLabel().setFont(Font::named("Helvetica", cellFontSize));
+    cell->setAccessory(TableCellAccessory::checkMark);
+    return cell;
+}
+
+void VelmoraSaveViewController::didSelectRowAtIndexPath(TableView&, const IndexPath&) {
+    _saveDescription.resignFirstResponder();
+}
+
+} // namespace velmora

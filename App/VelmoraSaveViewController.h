@@ -1,0 +1,71 @@
+#pragma once
+
+#include "Platform/Clock.h"
+#include "Platform/Value.h"
+#include "Toolkit/TableView.h"
+#include "Toolkit/TableViewDataSource.h"
+#include "Toolkit/TableViewDelegate.h"
+#include "Toolkit/TextField.h"
+#include "Toolkit/TextFieldDelegate.h"
+#include "Toolkit/ViewController.h"
+
+#include <memory>
+#include <string>
+
+namespace velmora {
+
+class VelmoraApp;
+
+/// The save screen: a list of what will be saved and a field for a description. Save writes one snapshot file
+/// to the diagnostic-log directory; either button closes the screen through the application object, which
+/// owns it. Main thread only.
+class VelmoraSaveViewController final : public ViewController,
+                                        public TextFieldDelegate,
+                                        public TableViewDataSource,
+                                        public TableViewDelegate {
+public:
+    /// `saveHistory` may be null: the model has no decoder. `app` must outlive the screen.
+    VelmoraSaveViewController(const ArrayRef& saveHistory, VelmoraApp& app);
+    ~VelmoraSaveViewController() override;
+
+    [[nodiscard]] TableView& saveContentTable() { return _saveContentTable; }
+    [[nodiscard]] TextField& saveDescription() { return _saveDescription; }
+
+    void viewDidLoad() override;
+    /// Only takes the screen's room up. The base does not hear of it; that is meant.
+    void viewWillAppear(bool animated) override;
+    void didReceiveMemoryWarning() override;
+    void viewDidUnload() override;
+
+    void savePressed();
+    void cancelPressed();
+    void backgroundTouched();
+
+    bool textFieldShouldReturn(TextField& textField) override;
+
+    [[nodiscard]] std::size_t numberOfSections(TableView& tableView) override;
+    [[nodiscard]] std::size_t numberOfRowsInSection(TableView& tableView, std::size_t section) override;
+    [[nodiscard]] std::shared_ptr<TableCell> cellForRowAtIndexPath(TableView& tableView,
+                                                                   const IndexPath& indexPath) override;
+    /// Only takes the keyboard away: every entry is always saved, none can be chosen.
+    void didSelectRowAtIndexPath(TableView& tableView, const IndexPath& indexPath) override;
+
+protected:
+    [[nodiscard]] std::unique_ptr<View> loadView() override;
+
+private:
+    /// The snapshot with what the field says now.
+    [[nodiscard]] DictionaryRef snapshot() const;
+    [[nodiscard]] std::string snapshotPath() const;
+    [[nodiscard]] bool writeSnapshot(const std::string& path) const;
+    void queueClosing();
+
+    /// When the screen was made. This, not the moment of saving, is the snapshot's.
+    Time _timeStamp;
+    ArrayRef _saveHistory;
+    TableView _saveContentTable;
+    TextField _saveDescription;
+    VelmoraApp& _app;
+};
+
+} // namespace velmora

@@ -1,0 +1,118 @@
+#include "App/SelfTest.h"
+#include "App/VelmoraApp.h"
+#include "Platform/Linux/FileResources.h"
+#include "Platform/Linux/LinuxFileSystem.h"
+#include "Platform/Linux/LinuxMessagePorts.h"
+#include "Platform/Linux/LinuxPreferences.h"
+#include "Platform/Linux/LinuxTelephonyService.h"
+#include "Platform/Linux/ProgramLog.h"
+#include "Platform/Linux/QtMainQueue.h"
+#include "Platform/SystemLog.h"
+
+#include <CLI/CLI.hpp>
+
+#include <chrono>
+#include <cstdio>
+#include <memory>
+#include <optional>
+#include <string>
+
+namespace {
+
+using namespace velmora;
+using namespace std::chrono_literals;
+
+constexpr int done = 0;
+constexpr int badUsage = 2;
+constexpr auto selfTestLimit = 60s;
+/// By then a service that is there has answered.
+constexpr auto serviceDelay = 3s;
+
+struct Options {
+    LinuxFileSystem::Options files;
+    LogKind log = LogKind::Syslog;
+    int logLevel = LogPriority::Notice;
+    bool isSelfTest = false;
+};
+
+void declare(CLI::App& app, Options& options) {
+    app.description("Shows live what the cellular modem reports about the radio network.");
+    app.set_version_flag("--version", "velmora " VELMORA_VERSION);
+    app.add_option("--sysroot", options.files.sysroot, "Put before the paths that the platform fixes")
+        ->envname("VELMORA_SYSROOT")
+        ->type_name("DIR");
+    app.add_option("--log-directory", options.files.logDirectory,
+                   "Where snapshots go (default $XDG_STATE_HOME/velmora)")
+        ->envname("VELMORA_LOG_DIRECTORY")
+        ->type_name("DIR");
+    app.add_option_function<std::string>(
+           "--log", [&options](const std::string& name) { options.log = *logKindNamed(name); },
+           "Where log lines go: syslog or stderr")
+        ->default_str("syslog")
+        ->check([](const std::string& name) {
+            return logKindNamed(name) ? std::string() : '"' + name + "\", wanted syslog or stderr";
+        });
+    app.add_option("--log-level", options.logLevel, "The least urgent lines that are written, 0 to 7")
+        ->check(CLI::Range(0, 7))
+        ->capture_default_str();
+    app.add_flag("--self-test", options.isSelfTest, "Open every screen on the first data, then exit");
+    app.footer("Velmora shows what a telephony service sends. With a synthetic drive as the service:\n"
+               "  velmora-telephonyd --source scenario:gsm,seed=1 &\n"
+               "  velmora");
+}
+
+class LinuxAppPlatform final : public AppPlatform {
+public:
+    explicit LinuxAppPlatform(const Options& options) : _files(options.files) {
+        if (const auto made = _files.makeStandardLogDirectory(); !made)
+            logFormat(LogPriority::Error, "Snapshots: %s", made.reason().c_str());
+    }
+    [[nodiscard]] ModelPlatform model() override {
+        return {_ports, _queue, _telephony, _clock,
+                [] { return std::optional<std::string>(logChannelPortName()); }};
+    }
+    [[nodiscard]] FileSystem& files() override { return _files; }
+    [[nodiscard]] Preferences& preferences() override { return _preferences; }
+
+private:
+    QtMainQueue _queue;
+    LinuxMessagePorts _ports;
+    LinuxTelephonyService _telephony{_ports};
+    MachineClock _clock;
+    LinuxFileSystem _files;
+    LinuxPreferences _preferences;
+};
+
+int show(const Options& options, char* program) {
+    // Before everything else, so that the last lines are still written.
+    const ProgramLog log(options.log, options.logLevel, "velmora");
+    FileResources files;
+    setResources(&files);
+    int count = 1;
+    char* arguments[] = {program, nullptr};
+    VelmoraApp app(count, arguments, [&options] { return std::make_unique<LinuxAppPlatform>(options); });
+    app.platform().model().queue.after(serviceDelay, [&app] {
+        if (!app.model().isConnected())
+            logLine(LogPriority::Notice,
+                    "no telephony service answers; one with a synthetic drive is started by: "
+                    "velmora-telephonyd --source scenario:gsm,seed=1");
+    });
+    std::unique_ptr<SelfTest> selfTest;
+    if (options.isSelfTest)
+        selfTest = std::make_unique<SelfTest>(app, selfTestLimit);
+    return app.run();
+}
+
+} // namespace
+
+int main(int argc, char** argv) {
+    Options options;
+    CLI::App app;
+    declare(app, options);
+    try {
+        app.parse(argc, argv);
+    } catch (const CLI::ParseError& error) {
+        return app.exit(error) == 0 ? done : badUsage;
+    }
+    return show(options, argv[0]);
+}

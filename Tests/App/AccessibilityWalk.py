@@ -1,0 +1,151 @@
+"""Uses the application as somebody with a screen reader does, from outside, through the accessibility tree.
+
+The real service and the real application run as processes. The walk goes two panes down and back, saves a
+snapshot, sees the service die and come back, and ends the application.
+"""
+
+import os
+import plistlib
+import signal
+import subprocess
+import sys
+import time
+
+import gi
+
+gi.require_version("Atspi", "2.0")
+from gi.repository import Atspi, GLib  # noqa: E402
+
+LIMIT_S = 20  # no step that works comes near it
+
+
+class Walk:
+    def __init__(self, build, directory):
+        self.build = build
+        self.ports = os.path.join(directory, "ports")
+        self.snapshots = os.path.join(directory, "snapshots")
+        root = os.path.join(directory, "root")
+        os.makedirs(os.path.join(root, "QuorraInternal/Library/PreferenceBundles/Carrier Settings.bundle"))
+        os.makedirs(self.ports, mode=0o700)
+        os.makedirs(self.snapshots)
+        source = os.path.dirname(os.path.dirname(os.path.dirname(os.path.abspath(__file__))))
+        self.environment = dict(
+            os.environ,
+            QT_QPA_PLATFORM="xcb",
+            QT_LINUX_ACCESSIBILITY_ALWAYS_ON="1",
+            VELMORA_PORT_DIR=self.ports,
+            VELMORA_SYSROOT=root,
+            VELMORA_LOG_DIRECTORY=self.snapshots,
+            VELMORA_RESOURCES=os.path.join(source, "Resources"),
+            XDG_CONFIG_HOME=os.path.join(directory, "config"),
+        )
+        self.service = None
+        self.application = None
+
+    def start(self, program, *arguments):
+        return subprocess.Popen([os.path.join(self.build, program), *arguments], env=self.environment)
+
+    def start_service(self):
+        self.service = self.start("velmora-telephonyd", "--source", "scenario:gsm,seed=1,speed=5")
+
+    def start_application(self):
+        self.application = self.start("velmora", "--log", "stderr", "--log-level", "3")
+
+    def wait(self, what, condition):
+        """What the condition gives once it gives something."""
+        end = time.monotonic() + LIMIT_S
+        while time.monotonic() < end:
+            GLib.MainContext.default().iteration(False)
+            try:
+                found = condition()
+            except GLib.Error:  # an object that has just gone
+                found = None
+            if found:
+                return found
+            time.sleep(0.05)
+        raise AssertionError("never seen: " + what + "\n" + self.picture())
+
+    def objects(self):
+        """Every object that is shown, with its role and name, top down."""
+        desktop = Atspi.get_desktop(0)
+        desktop.clear_cache()
+        waiting = [desktop.get_child_at_index(i) for i in range(desktop.get_child_count())]
+        while waiting:
+            item = waiting.pop(0)
+            if item is None:
+                continue
+            if item.get_state_set().contains(Atspi.StateType.SHOWING):
+                yield item, item.get_role_name(), item.get_name()
+            waiting[:0] = [item.get_child_at_index(i) for i in range(item.get_child_count())]
+
+    def picture(self):
+        return "\n".join(f"{role}: {name!r}" for _, role, name in self.objects())
+
+    def find(self, role, start=""):
+        """The last object shown of the role whose name begins so: what is on top comes last."""
+        found = [item for item, its, name in self.objects() if its == role and name.startswith(start)]
+        return found[-1] if found else None
+
+    def see(self, role, start=""):
+        return self.wait(f"{role} {start!r}", lambda: self.find(role, start))
+
+    def press(self, role, name):
+        assert self.see(role, name).do_action(0), f"{role} {name!r} cannot be pressed"
+
+    def run(self):
+        self.start_service()
+        self.start_application()
+
+        self.see("label", "Updated ")
+        assert self.find("animation") is None, "the indicator spins while connected"
+
+        # Two panes down, and back.
+        self.press("list item", "Registration")
+        self.see("heading", "Registration")
+        self.press("list item", "Serving PLMN")
+        self.see("heading", "Serving PLMN")
+        row = self.see("list item", "Mobile Country Code").get_name()
+        assert "001" in row, f"the row's value is not heard: {row!r}"
+        self.press("push button", "Back")
+        self.see("heading", "Registration")
+        self.press("push button", "Back")
+        self.see("heading", "Velmora")
+
+        # A snapshot.
+        self.press("push button", "Save")
+        self.see("list item", "DLF binary (")
+        self.press("push button", "Save")
+        self.wait("a snapshot", lambda: os.listdir(self.snapshots))
+        self.wait("the save screen closed", lambda: self.find("list item", "DLF binary (") is None)
+        with open(os.path.join(self.snapshots, os.listdir(self.snapshots)[0]), "rb") as file:
+            snapshot = plistlib.load(file)
+        assert list(snapshot) == ["Timestamp", "Data", "Description"], list(snapshot)
+        assert snapshot["Data"][-1]["DLF"][:4] == bytes.fromhex("A100FD1F"), "no DLF log in it"
+
+        # The service dies and comes back.
+        self.service.send_signal(signal.SIGKILL)
+        self.service.wait()
+        self.see("label", "Connecting...")
+        self.see("animation")
+        self.start_service()
+        self.see("label", "Updated ")
+        self.wait("the indicator hidden", lambda: self.find("animation") is None)
+
+        self.application.terminate()
+        assert self.application.wait(LIMIT_S) == 0, "the application did not end well"
+        self.application = None
+        left = [name for name in os.listdir(self.ports) if "BasebandStateReport" in name]
+        assert not left, f"left behind: {left}"
+
+    def end(self):
+        for process in (self.application, self.service):
+            if process and process.poll() is None:
+                process.kill()
+                process.wait()
+
+
+walk = Walk(sys.argv[1], sys.argv[2])
+try:
+    walk.run()
+finally:
+    walk.end()

@@ -1,0 +1,14 @@
+#include <gmock/gmock.h>
+
+#include <cstdlib>
+
+int main(int argc, char** argv) {
+    // No display, no bus, no desktop settings: every machine shows the same.
+    ::setenv("QT_QPA_PLATFORM", "offscreen", 1);
+    ::setenv("QT_QPA_PLATFORMTHEME", "", 1);
+    ::setenv("VELMORA_REDUCED_MOTION", "1", 0); // what is opened is there at once
+    ::unsetenv("QT_STYLE_OVERRIDE");
+    ::unsetenv("QT_SCALE_FACTOR");
+    testing::InitGoogleMock(&argc, argv);
+    return RUN_ALL_TESTS();
+}

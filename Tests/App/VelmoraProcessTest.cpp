@@ -1,0 +1,172 @@
+#include "Tests/Support/TemporaryDirectory.h"
+
+#include <gmock/gmock.h>
+#include <gtest/gtest.h>
+
+#include <QElapsedTimer>
+#include <QFile>
+#include <QProcess>
+#include <QThread>
+
+#include <csignal>
+#include <filesystem>
+#include <functional>
+#include <memory>
+#include <string>
+
+namespace velmora {
+namespace {
+
+using testing::HasSubstr;
+using testing::Not;
+
+/// The built program beside a built service, over real sockets in a directory of the test's.
+class VelmoraProcessTest : public testing::Test {
+protected:
+    static constexpr int patience_ms = 40'000;
+
+    std::unique_ptr<QProcess> start(const char* program, const QStringList& arguments) {
+        auto process = std::make_unique<QProcess>();
+        auto environment = QProcessEnvironment::systemEnvironment();
+        environment.insert("VELMORA_PORT_DIR", path("ports"));
+        environment.insert("XDG_STATE_HOME", path("state"));
+        environment.insert("XDG_CONFIG_HOME", path("config"));
+        environment.remove("VELMORA_SYSROOT");
+        environment.remove("VELMORA_LOG_DIRECTORY");
+        process->setProcessEnvironment(environment);
+        process->setStandardOutputFile(path(program) + ".out");
+        process->setStandardErrorFile(path(program) + ".err");
+        process->start(QString(VELMORA_BUILD_DIR "/") + program, arguments);
+        EXPECT_TRUE(process->waitForStarted());
+        return process;
+    }
+    std::unique_ptr<QProcess> startService(const char* scenario = "gsm") {
+        auto service = start("velmora-telephonyd", {"--source", QString("scenario:%1,seed=1").arg(scenario)});
+        EXPECT_TRUE(eventually([&] { return exists("ports/com.velmora.vox.server"); }));
+        return service;
+    }
+    [[nodiscard]] QString path(const char* name) const {
+        return QString::fromStdString((directory / name).string());
+    }
+    [[nodiscard]] bool exists(const char* name) const { return std::filesystem::exists(directory / name); }
+    [[nodiscard]] std::string text(const char* name) const {
+        QFile file(path(name));
+        return file.open(QIODevice::ReadOnly) ? file.readAll().toStdString() : "";
+    }
+    static bool eventually(const std::function<bool()>& condition) {
+        QElapsedTimer waited;
+        waited.start();
+        while (!condition()) {
+            if (waited.elapsed() > patience_ms)
+                return false;
+            QThread::msleep(10);
+        }
+        return true;
+    }
+    static int exitStatus(QProcess& process) {
+        if (!process.waitForFinished(patience_ms))
+            return -1;
+        return process.exitStatus() == QProcess::NormalExit ? process.exitCode() : -2;
+    }
+    static void end(QProcess& process) {
+        ::kill(static_cast<pid_t>(process.processId()), SIGTERM);
+        EXPECT_EQ(exitStatus(process), 0);
+    }
+
+    TemporaryDirectory directory;
+};
+
+class VelmoraSelfTest : public VelmoraProcessTest, public testing::WithParamInterface<const char*> {};
+
+TEST_P(VelmoraSelfTest, OpensEveryScreenOnTheServicesData) {
+    const auto service = startService(GetParam());
+    const auto app = start("velmora", {"--self-test", "--log", "stderr", "--log-level", "5"});
+    EXPECT_EQ(exitStatus(*app), 0) << text("velmora.err");
+    EXPECT_THAT(text("velmora.err"),
+                testing::ContainsRegex("<5>Self-test: opened [0-9]+ panes and the save screen"));
+    // The sockets are gone with it, the standard directory for snapshots is there.
+    EXPECT_FALSE(exists("ports/com.velmora.BasebandStateReport.LogChannel"));
+    EXPECT_TRUE(exists("state/velmora"));
+    end(*service);
+}
+
+INSTANTIATE_TEST_SUITE_P(Technologies, VelmoraSelfTest, testing::Values("gsm", "lte", "utran", "c2k", "ifx"),
+                         [](const auto& row) { return std::string(row.param); });
+
+class VelmoraSignalTest : public VelmoraProcessTest, public testing::WithParamInterface<int> {};
+
+TEST_P(VelmoraSignalTest, EndsItCleanly) {
+    const auto service = startService();
+    const auto app = start("velmora", {"--log", "stderr"});
+    ASSERT_TRUE(eventually([&] { return exists("ports/com.velmora.BasebandStateReport.LogChannel"); }));
+    ::kill(static_cast<pid_t>(app->processId()), GetParam());
+    EXPECT_EQ(exitStatus(*app), 0) << text("velmora.err");
+    EXPECT_FALSE(exists("ports/com.velmora.BasebandStateReport.LogChannel"));
+    end(*service);
+}
+
+INSTANTIATE_TEST_SUITE_P(Signals, VelmoraSignalTest, testing::Values(SIGINT, SIGTERM), [](const auto& row) {
+    return std::string(row.param == SIGINT ? "Interrupt" : "Terminate");
+});
+
+TEST_F(VelmoraProcessTest, WithoutAServiceTheLogSaysHowToStartOne) {
+    const auto app = start("velmora", {"--log", "stderr"});
+    EXPECT_TRUE(eventually([&] {
+        return text("velmora.err")
+                   .find("<5>no telephony service answers; one with a synthetic drive is started "
+                         "by: velmora-telephonyd --source scenario:gsm,seed=1\n") != std::string::npos;
+    })) << text("velmora.err");
+    EXPECT_THAT(text("velmora.err"), HasSubstr("<3>Could not create the ports necessary\n"));
+    end(*app);
+}
+
+TEST_F(VelmoraProcessTest, NamedLogDirectoryIsNotMade) {
+    const auto app = start("velmora", {"--log", "stderr", "--log-directory", path("named")});
+    ASSERT_TRUE(
+        eventually([&] { return text("velmora.err").find("Could not create") != std::string::npos; }));
+    end(*app);
+    EXPECT_FALSE(exists("named"));
+    EXPECT_FALSE(exists("state/velmora"));
+}
+
+TEST_F(VelmoraProcessTest, HelpShowsTheOptionsAndAnExample) {
+    const auto app = start("velmora", {"--help"});
+    EXPECT_EQ(exitStatus(*app), 0);
+    const std::string help = text("velmora.out");
+    for (const char* part :
+         {"--sysroot", "VELMORA_SYSROOT", "--log-directory", "VELMORA_LOG_DIRECTORY", "--log ", "--log-level",
+          "--self-test", "--version", "velmora-telephonyd --source scenario:gsm,seed=1"})
+        EXPECT_THAT(help, HasSubstr(part));
+}
+
+TEST_F(VelmoraProcessTest, VersionIsTheProjects) {
+    const auto app = start("velmora", {"--version"});
+    EXPECT_EQ(exitStatus(*app), 0);
+    EXPECT_EQ(text("velmora.out"), "velmora " VELMORA_TEST_VERSION "\n");
+}
+
+struct UsageRow {
+    const char* name;
+    QStringList arguments;
+    const char* message;
+};
+
+class VelmoraUsageTest : public VelmoraProcessTest, public testing::WithParamInterface<UsageRow> {};
+
+TEST_P(VelmoraUsageTest, IsRefused) {
+    const auto app = start("velmora", GetParam().arguments);
+    EXPECT_EQ(exitStatus(*app), 2);
+    EXPECT_EQ(text("velmora.err"),
+              std::string(GetParam().message) + "\nRun with --help for more information.\n");
+}
+
+INSTANTIATE_TEST_SUITE_P(
+    Wrong, VelmoraUsageTest,
+    testing::Values(
+        UsageRow{"UnknownOption", {"--speed"}, "The following argument was not expected: --speed"},
+        UsageRow{"UnknownLog", {"--log", "paper"}, "--log: \"paper\", wanted syslog or stderr"},
+        UsageRow{"LevelTooHigh", {"--log-level", "8"}, "--log-level: Value 8 not in range 0 to 7"}),
+    [](const auto& row) { return std::string(row.param.name); });
+
+} // namespace
+} // namespace velmora
