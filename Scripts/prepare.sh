@@ -1,7 +1,9 @@
 # What ./run and ./test share: installing what is missing, configuring, building. Sourced, not run.
 
-build_packages=(build-essential cmake ninja-build qt6-base-dev libpugixml-dev libcli11-dev nlohmann-json3-dev)
-test_packages=(libgtest-dev libgmock-dev libbenchmark-dev python3 tshark clang-format)
+build_packages=(build-essential cmake ninja-build qt6-base-dev libgl-dev libpugixml-dev libcli11-dev
+    nlohmann-json3-dev)
+test_packages=(libgtest-dev libgmock-dev libbenchmark-dev python3 tshark clang-format fonts-dejavu-core xvfb dbus
+    at-spi2-core gir1.2-atspi-2.0 python3-gi desktop-file-utils appstream)
 
 say() { printf '%s\n' "$*" >&2; }
 
