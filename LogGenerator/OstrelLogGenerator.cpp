@@ -88,8 +88,8 @@ std::optional<Data> OstrelLogGenerator::generateDlfFromState(const Dictionary& s
             }
             if (raw->size() < 2)
                 continue;
-            // Only the buffer's first byte, a type byte, goes: those of its further messages stay, as the
-            // format's readers of these files expect.
+            // Only the buffer's first byte, a type byte, goes; those of its further messages stay. That is
+            // how the file is written, and it is kept.
             const Bytes rest = raw->bytes().subspan(1);
             dlf.insert(dlf.end(), rest.begin(), rest.end());
         }
