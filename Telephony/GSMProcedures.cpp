@@ -112,20 +112,26 @@ void GSMProcedures::accept(double at) {
     });
 }
 
-void GSMProcedures::campOnGSM() {
+std::optional<RecordBuilder> GSMProcedures::campOnGSM() {
     _phone.radio = GSMPhone::Radio::GSM;
     _phone.umts = {};
     _phone.rrc = RRCState::Disconnected;
     if (!_network.gsm().empty())
         _phone.gsm = _network.gsm().front();
+    if (!_phone.gsm.cell)
+        return std::nullopt;
+    return gsmServingCell(*_phone.gsm.cell);
 }
 
-void GSMProcedures::campOnUMTS() {
+std::optional<RecordBuilder> GSMProcedures::campOnUMTS() {
     _phone.radio = GSMPhone::Radio::UMTS;
     _phone.gsm = {};
     _phone.rr = RRState::Inactive;
     if (!_network.umts().empty())
         _phone.umts = _network.umts().front();
+    if (!_phone.umts.cell)
+        return std::nullopt;
+    return umtsServingCell(*_phone.umts.cell, 1);
 }
 
 void GSMProcedures::powerOn(double now) {
@@ -144,12 +150,7 @@ void GSMProcedures::powerOn(double now) {
     sayRR(now + 5.0, RRState::CellSelection);
     sayRR(now + 7.0, RRState::ChooseCell);
     sayRR(now + 7.6, RRState::EarlyCampedWaitForSI);
-    say(now + 8.4, [this]() -> std::optional<RecordBuilder> {
-        campOnGSM();
-        if (!_phone.gsm.cell)
-            return std::nullopt;
-        return gsmServingCell(*_phone.gsm.cell);
-    });
+    say(now + 8.4, [this] { return campOnGSM(); });
     sayRR(now + 8.7, RRState::Idle);
 }
 
@@ -242,12 +243,7 @@ void GSMProcedures::endCall(double now) {
 
 void GSMProcedures::handOverToUMTS(double now) {
     sayRR(now, RRState::GSMToUMTSHandover);
-    say(now + 0.6, [this]() -> std::optional<RecordBuilder> {
-        campOnUMTS();
-        if (!_phone.umts.cell)
-            return std::nullopt;
-        return umtsServingCell(*_phone.umts.cell, 1);
-    });
+    say(now + 0.6, [this] { return campOnUMTS(); });
     sayRRC(now + 0.7, RRCState::CellDCH);
     say(now + 0.8, [] { return ciphering(true); });
     sayRR(now + 0.9, RRState::Inactive);
@@ -255,24 +251,14 @@ void GSMProcedures::handOverToUMTS(double now) {
 
 void GSMProcedures::reselectToUMTS(double now) {
     sayRR(now, RRState::GSMToUMTSReselection);
-    say(now + 1.0, [this]() -> std::optional<RecordBuilder> {
-        campOnUMTS();
-        if (!_phone.umts.cell)
-            return std::nullopt;
-        return umtsServingCell(*_phone.umts.cell, 1);
-    });
+    say(now + 1.0, [this] { return campOnUMTS(); });
     sayRR(now + 1.1, RRState::Inactive);
     sayRRC(now + 1.2, RRCState::Disconnected);
 }
 
 void GSMProcedures::reselectToGSM(double now) {
     sayRR(now, RRState::UMTSToGSMReselection);
-    say(now + 1.0, [this]() -> std::optional<RecordBuilder> {
-        campOnGSM();
-        if (!_phone.gsm.cell)
-            return std::nullopt;
-        return gsmServingCell(*_phone.gsm.cell);
-    });
+    say(now + 1.0, [this] { return campOnGSM(); });
     sayRR(now + 1.2, RRState::Idle);
 }
 

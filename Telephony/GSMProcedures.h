@@ -3,6 +3,7 @@
 #include "Telephony/DriveScript.h"
 #include "Telephony/GSMPhone.h"
 
+#include <optional>
 #include <utility>
 
 namespace velmora {
@@ -45,8 +46,9 @@ private:
     void release(double at);
     /// The network's acceptance of a location update: identities and the equivalent networks.
     void accept(double at);
-    void campOnGSM();
-    void campOnUMTS();
+    /// The phone moves to the best cell there; its record, none where there is no cell.
+    [[nodiscard]] std::optional<RecordBuilder> campOnGSM();
+    [[nodiscard]] std::optional<RecordBuilder> campOnUMTS();
 
     GSMPhone& _phone;
     const RadioNetwork& _network;
