@@ -1,8 +1,10 @@
 #pragma once
 
 #include "Platform/Bytes.h"
+#include "Platform/Clock.h"
 #include "Platform/Value.h"
 
+#include <chrono>
 #include <cstdint>
 #include <initializer_list>
 #include <string_view>
@@ -24,6 +26,12 @@ namespace velmora {
 
 /// As `recordOf`, the payload given as `hex` takes it.
 [[nodiscard]] Data record(std::uint16_t code, std::string_view payloadHex, std::uint8_t type = 1);
+
+/// 1980-01-06 00:00:00 UTC, the moment whose time stamp is the eight zero bytes of the records above.
+[[nodiscard]] inline Time zeroHour() {
+    using namespace std::chrono;
+    return sys_days{year{1980} / January / 6};
+}
 
 /// A record of the telephony service's extra stream (type 0xFF) whose payload is the value as an XML property
 /// list. Throws std::invalid_argument for a value that has no such form.

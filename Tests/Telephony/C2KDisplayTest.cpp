@@ -1,18 +1,12 @@
-#include "LogGenerator/LogGenerator.h"
 #include "Platform/TelephonyService.h"
-#include "Tests/Support/CapturedLog.h"
-#include "Tests/Support/FakeClock.h"
-#include "Tests/Support/FakeResources.h"
 #include "Tests/Telephony/C2KLayouts.h"
+#include "Tests/Telephony/DisplayTesting.h"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
 #include <algorithm>
-#include <fstream>
-#include <iterator>
 #include <map>
-#include <memory>
 #include <set>
 #include <string>
 
@@ -23,12 +17,9 @@ using namespace c2k;
 using ::testing::MatchesRegex;
 
 /// The scenario through the technology's decoder, with the template that is shipped.
-class C2KDisplayTest : public testing::Test {
+class C2KDisplayTest : public DisplayTest {
 protected:
-    C2KDisplayTest() {
-        std::ifstream file(VELMORA_SOURCE_DIR "/Resources/C2KTemplate.plist", std::ios::binary);
-        resources.put("C2KTemplate", "plist",
-                      Data(std::vector<std::uint8_t>(std::istreambuf_iterator<char>(file), {})));
+    C2KDisplayTest() : DisplayTest(kVoxLogChannelTechnology_Ostrel_CDMA, "C2KTemplate") {
         static_cast<void>(decoder->generateLogUsingState(state)); // builds the display
     }
 
@@ -42,12 +33,6 @@ protected:
                 if (key != "_sorted")
                     collect(value, key.find(';') == std::string::npos ? path + "/" + key : path, texts);
     }
-
-    FakeClock clock;
-    FakeResources resources;
-    std::unique_ptr<LogGenerator> decoder =
-        LogGenerator::generatorFromTechnology(kVoxLogChannelTechnology_Ostrel_CDMA, clock);
-    Dictionary state;
 };
 
 TEST_F(C2KDisplayTest, onlyOddMessagesAreReported) {

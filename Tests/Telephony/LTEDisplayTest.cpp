@@ -1,19 +1,12 @@
 #include "Telephony/LTEScenario.h"
 
-#include "LogGenerator/LogGenerator.h"
 #include "Platform/TelephonyService.h"
-#include "Tests/Support/CapturedLog.h"
-#include "Tests/Support/FakeClock.h"
-#include "Tests/Support/FakeResources.h"
+#include "Tests/Telephony/DisplayTesting.h"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
-#include <fstream>
-#include <functional>
-#include <iterator>
 #include <map>
-#include <memory>
 #include <set>
 
 /// The LTE scenario through the technology's decoder, with the template that is shipped.
@@ -24,41 +17,9 @@ namespace {
 using namespace std::chrono_literals;
 using ::testing::IsSupersetOf;
 
-class LTEDisplayTest : public testing::Test {
+class LTEDisplayTest : public DisplayTest {
 protected:
-    LTEDisplayTest() {
-        std::ifstream file(VELMORA_SOURCE_DIR "/Resources/LTE.plist", std::ios::binary);
-        resources.put("LTE", "plist",
-                      Data(std::vector<std::uint8_t>(std::istreambuf_iterator<char>(file), {})));
-        decoder = LogGenerator::generatorFromTechnology(kVoxLogChannelTechnology_Ostrel_LTE, clock);
-    }
-
-    /// Decodes the first `duration` and calls `look` after every message; keeps the error lines.
-    void play(std::uint64_t seed, std::chrono::nanoseconds duration, const std::function<void()>& look) {
-        LTEScenario scenario(seed);
-        CapturedLog log(LogPriority::Error);
-        for (ScenarioEvent event = scenario.next(); event.offset < duration; event = scenario.next()) {
-            decoder->updateState(state, event.message);
-            look();
-        }
-        errors = log.textsAt(LogPriority::Error);
-    }
-    [[nodiscard]] const Dictionary& dictionary(std::string_view group, std::string_view section) const {
-        return *(*(*state["Display"].asDictionary())[group].asDictionary())[section].asDictionary();
-    }
-    [[nodiscard]] const Array& list(std::string_view group, std::string_view section) const {
-        return *(*(*state["Display"].asDictionary())[group].asDictionary())[section].asArray();
-    }
-    [[nodiscard]] static std::string text(const Dictionary& row, std::string_view label) {
-        const std::string* shown = row[label].asString();
-        return shown ? *shown : "(none)";
-    }
-
-    FakeClock clock;
-    FakeResources resources;
-    std::unique_ptr<LogGenerator> decoder;
-    Dictionary state;
-    std::vector<std::string> errors;
+    LTEDisplayTest() : DisplayTest(kVoxLogChannelTechnology_Ostrel_LTE, "LTE") {}
 };
 
 TEST_F(LTEDisplayTest, everySectionIsFilled) {
@@ -80,14 +41,14 @@ TEST_F(LTEDisplayTest, everySectionIsFilled) {
         {"Connected Mode", "Detected Cells"},
         {"Packet Data", "PDP Context Info"},
     };
-    play(1, 4min, [&] {
+    play<LTEScenario>(1, 4min, [&] {
         for (const auto& [group, section] : dictionaries)
-            labels[section] = std::max(labels[section], dictionary(group, section).size());
+            labels[section] = std::max(labels[section], node(group, section).asDictionary()->size());
         for (const auto& [group, section] : lists)
-            most[section] = std::max(most[section], list(group, section).size());
-        bandwidths.insert(text(dictionary("Serving Cell", "Serving Cell Info"), "Download Bandwidth"));
-        for (const Value& row : list("Reselection", "Reselection Candidates List"))
-            types.insert(text(*row.asDictionary(), "Candidate RAT Type"));
+            most[section] = std::max(most[section], node(group, section).asArray()->size());
+        bandwidths.insert(text(node("Serving Cell", "Serving Cell Info"), "Download Bandwidth"));
+        for (const Value& row : *node("Reselection", "Reselection Candidates List").asArray())
+            types.insert(text(row, "Candidate RAT Type"));
     });
     EXPECT_EQ(labels, (std::map<std::string, std::size_t>{
                           {"Serving Cell Info", 10}, // "UARFCN" among them, while it is there
@@ -103,16 +64,14 @@ TEST_F(LTEDisplayTest, everySectionIsFilled) {
     EXPECT_THAT(bandwidths,
                 IsSupersetOf<std::string>({"1.4 MHz", "3 MHz", "5 MHz", "10 MHz", "15 MHz", "20 MHz"}));
     EXPECT_EQ(types, (std::set<std::string>{"LTE", "UTRAN", "GERAN", "CDMA1XRTT", "CDMAHRPD", "?\?"}));
-    EXPECT_EQ((*state["Display"].asDictionary())["SIM Info"].asDictionary()->size(), 14u);
+    EXPECT_EQ(node("SIM Info").asDictionary()->size(), 14u);
 }
 
 TEST_F(LTEDisplayTest, shownValuesArePlausible) {
-    const auto number = [](const Dictionary& row, std::string_view label) {
-        return std::stod(text(row, label));
-    };
-    play(2, 4min, [&] {
-        const Dictionary& serving = dictionary("Serving Cell", "Serving Cell Measurements");
-        if (!serving.empty()) {
+    const auto number = [](const Value& row, std::string_view label) { return std::stod(text(row, label)); };
+    play<LTEScenario>(2, 4min, [&] {
+        const Value& serving = node("Serving Cell", "Serving Cell Measurements");
+        if (!serving.asDictionary()->empty()) {
             EXPECT_GE(number(serving, "Measured RSRP"), -140);
             EXPECT_LE(number(serving, "Measured RSRP"), -44);
             EXPECT_GE(number(serving, "Average RSRQ"), -19.5);
@@ -126,8 +85,7 @@ TEST_F(LTEDisplayTest, shownValuesArePlausible) {
             // What the cell has above the least level; rounded.
             EXPECT_NEAR(number(serving, "Srxlev"), number(serving, "Measured RSRP") + 120, 0.75);
         }
-        for (const Value& each : list("Idle Mode Neighbors", "Neighbor Cells List")) {
-            const Dictionary& row = *each.asDictionary();
+        for (const Value& row : *node("Idle Mode Neighbors", "Neighbor Cells List").asArray()) {
             EXPECT_LE(number(row, "Physical Cell ID"), 503);
             EXPECT_GE(number(row, "Measured RSRP"), -140);
             EXPECT_LE(number(row, "Measured RSRP"), -44);
@@ -135,10 +93,10 @@ TEST_F(LTEDisplayTest, shownValuesArePlausible) {
             EXPECT_LT(number(row, "Ant 0 Frame Offset"), 1024);
             EXPECT_LT(number(row, "Ant 0 Sample Offset"), 307200);
         }
-        const Array& candidates = list("Reselection", "Reselection Candidates List");
+        const Array& candidates = *node("Reselection", "Reselection Candidates List").asArray();
         // Of several, only the last one's fields are its own.
         if (candidates.size() == 1) {
-            const Dictionary& row = *candidates[0].asDictionary();
+            const Value& row = candidates[0];
             const std::string type = text(row, "Candidate RAT Type");
             EXPECT_LE(number(row, "Candidate Priority"), 7);
             if (type == "LTE") {
@@ -161,7 +119,7 @@ TEST_F(LTEDisplayTest, shownValuesArePlausible) {
 }
 
 TEST_F(LTEDisplayTest, onlyTheOddMessagesAreReported) {
-    play(3, 20min, [] {});
+    play<LTEScenario>(3, 20min, [] {});
     int wrongType = 0;
     int antennas = 0;
     std::map<std::string, int> overruns;

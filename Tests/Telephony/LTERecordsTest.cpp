@@ -12,12 +12,6 @@ namespace {
 
 using namespace records;
 
-/// 1980-01-06 00:00:00 UTC, whose time stamp is 0, so that records compare with `record`.
-Time zeroHour() {
-    using namespace std::chrono;
-    return sys_days{year{1980} / January / 6};
-}
-
 const LTECell cellA{0, 503, 0x1A00001, {{1, 1}, 7101, 1}};
 const LTECell cellB{0, 300, 0x1A00102, {{1, 2}, 8201, 7}};
 

@@ -17,12 +17,6 @@ namespace {
 
 using namespace records;
 
-/// 1980-01-06 00:00:00 UTC, whose time stamp is 0, so that records compare with `record`.
-Time zeroHour() {
-    using namespace std::chrono;
-    return sys_days{year{1980} / January / 6};
-}
-
 const GSMCell gsmA{62, 37, 10101, {{1, 1}, 4101, 1}};
 const GSMCell gsmB{540, 5, 258, {{1, 1}, 4101, 1}};
 const UMTSCell umtsA{10588, 300, 0x041012D, {{1, 1}, 4101, 1}};

@@ -1,19 +1,12 @@
 #include "Telephony/UTRANScenario.h"
 
-#include "LogGenerator/LogGenerator.h"
 #include "Platform/TelephonyService.h"
-#include "Tests/Support/CapturedLog.h"
-#include "Tests/Support/FakeClock.h"
-#include "Tests/Support/FakeResources.h"
+#include "Tests/Telephony/DisplayTesting.h"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
-#include <fstream>
-#include <functional>
-#include <iterator>
 #include <map>
-#include <memory>
 #include <set>
 
 /// The UTRAN scenario through the technology's decoder, with the template that is shipped.
@@ -24,41 +17,9 @@ namespace {
 using namespace std::chrono_literals;
 using ::testing::MatchesRegex;
 
-class UTRANDisplayTest : public testing::Test {
+class UTRANDisplayTest : public DisplayTest {
 protected:
-    UTRANDisplayTest() {
-        std::ifstream file(VELMORA_SOURCE_DIR "/Resources/Ostrel_UTRAN.plist", std::ios::binary);
-        resources.put("Ostrel_UTRAN", "plist",
-                      Data(std::vector<std::uint8_t>(std::istreambuf_iterator<char>(file), {})));
-        decoder = LogGenerator::generatorFromTechnology(kVoxLogChannelTechnology_Ostrel_UTRAN2, clock);
-    }
-
-    /// Decodes the first `duration` and calls `look` after every message; keeps the error lines.
-    void play(std::uint64_t seed, std::chrono::nanoseconds duration, const std::function<void()>& look) {
-        UTRANScenario scenario(seed);
-        CapturedLog log(LogPriority::Error);
-        for (ScenarioEvent event = scenario.next(); event.offset < duration; event = scenario.next()) {
-            decoder->updateState(state, event.message);
-            look();
-        }
-        errors = log.textsAt(LogPriority::Error);
-    }
-    [[nodiscard]] const Value& node(std::string_view group, std::string_view section) const {
-        return (*(*state["Display"].asDictionary())[group].asDictionary())[section];
-    }
-    [[nodiscard]] const Value& node(std::string_view section) const {
-        return (*state["Display"].asDictionary())[section];
-    }
-    [[nodiscard]] static std::string text(const Value& row, std::string_view label) {
-        const std::string* shown = (*row.asDictionary())[label].asString();
-        return shown ? *shown : "(none)";
-    }
-
-    FakeClock clock;
-    FakeResources resources;
-    std::unique_ptr<LogGenerator> decoder;
-    Dictionary state;
-    std::vector<std::string> errors;
+    UTRANDisplayTest() : DisplayTest(kVoxLogChannelTechnology_Ostrel_UTRAN2, "Ostrel_UTRAN") {}
 };
 
 TEST_F(UTRANDisplayTest, everySectionThatCanBeFilledIs) {
@@ -66,7 +27,7 @@ TEST_F(UTRANDisplayTest, everySectionThatCanBeFilledIs) {
     std::set<std::string> access;
     std::map<std::string, std::set<std::size_t>> sizes;
     std::set<std::string> status;
-    play(1, 4min, [&] {
+    play<UTRANScenario>(1, 4min, [&] {
         rrc.insert(text(node("Serving Cell", "RRC Info"), "State"));
         access.insert(text(node("Serving Cell", "Serving Cell Info"), "Allowed Access"));
         sizes["UTRAN"].insert(node("Neighbors", "Neighbor Cell List").asArray()->size());
@@ -98,7 +59,7 @@ TEST_F(UTRANDisplayTest, everySectionThatCanBeFilledIs) {
 }
 
 TEST_F(UTRANDisplayTest, shownValuesArePlausible) {
-    play(2, 4min, [&] {
+    play<UTRANScenario>(2, 4min, [&] {
         for (const Value& row : *node("Neighbors", "Neighbor Cell List").asArray()) {
             EXPECT_THAT(text(row, "UARFCN"), MatchesRegex("10[01][0-9][0-9]"));
             EXPECT_LE(std::stoi(text(row, "Cell ID")), 127);
@@ -117,7 +78,7 @@ TEST_F(UTRANDisplayTest, shownValuesArePlausible) {
 }
 
 TEST_F(UTRANDisplayTest, onlyTheOddMessagesAreReported) {
-    play(3, 20min, [] {});
+    play<UTRANScenario>(3, 20min, [] {});
     int wrongType = 0;
     std::map<std::string, int> overruns;
     for (const std::string& line : errors) {

@@ -14,12 +14,6 @@ namespace {
 
 using namespace records;
 
-/// 1980-01-06 00:00:00 UTC, whose time stamp is 0, so that records compare with `record`.
-Time zeroHour() {
-    using namespace std::chrono;
-    return sys_days{year{1980} / January / 6};
-}
-
 const UTRANCell cellA{10054, 85, 0x041012D, {{1, 1}, 4101, 1}};
 const UTRANCell cellB{10121, 42, 7, {{1, 1}, 4101, 1}};
 
