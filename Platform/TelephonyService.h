@@ -1,5 +1,6 @@
 #pragma once
 
+#include <array>
 #include <cstdint>
 #include <functional>
 #include <memory>
@@ -46,6 +47,13 @@ inline constexpr std::string_view kVoxLogChannelTechnology_Ostrel_LTE = "kVoxLog
 inline constexpr std::string_view kVoxLogChannelTechnology_Ostrel_UTRAN2 =
     "kVoxLogChannelTechnology_Ostrel_UTRAN2";
 
+/// All of them.
+inline constexpr std::array voxTechnologies = {
+    kVoxLogChannelTechnology_IFX,           kVoxLogChannelTechnology_Ostrel_GSM,
+    kVoxLogChannelTechnology_Ostrel_CDMA,   kVoxLogChannelTechnology_Ostrel_LTE,
+    kVoxLogChannelTechnology_Ostrel_UTRAN2,
+};
+
 /// What stands before a technology's short name ("Ostrel_GSM") in the service's constant.
 inline constexpr std::string_view voxTechnologyPrefix = "kVoxLogChannelTechnology_";
 
@@ -60,6 +68,24 @@ inline constexpr std::string_view voxTechnologyPrefix = "kVoxLogChannelTechnolog
 /// The service's constant for a short name; a constant is returned as it is.
 [[nodiscard]] inline std::string technologyConstant(std::string_view name) {
     return std::string(voxTechnologyPrefix) + std::string(shortTechnologyName(name));
+}
+
+/// The short names of all technologies, as users write them: "IFX, Ostrel_GSM, ...".
+[[nodiscard]] inline std::string technologyNames() {
+    std::string names;
+    for (const std::string_view technology : voxTechnologies) {
+        names += names.empty() ? "" : ", ";
+        names += shortTechnologyName(technology);
+    }
+    return names;
+}
+
+/// Whether the name, in short or the service's constant, is one of the technologies'.
+[[nodiscard]] inline bool isTechnology(std::string_view name) {
+    for (const std::string_view technology : voxTechnologies)
+        if (shortTechnologyName(technology) == shortTechnologyName(name))
+            return true;
+    return false;
 }
 
 /// The keys of a cell dictionary in the cell information array, and the values of the two that are compared.

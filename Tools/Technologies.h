@@ -10,8 +10,9 @@
 
 namespace velmora {
 
-/// The short names of the log technologies, as users write them: "IFX, Ostrel_GSM, ...".
-[[nodiscard]] std::string technologyNames();
+/// The telephony service's constant for a technology, named in short or by that constant. Fails with the
+/// names that there are where it is none of them, or is empty.
+[[nodiscard]] Result<std::string> technologyNamed(std::string_view name);
 
 /// A decoder for the technology, named in short or by the telephony service's constant. Fails with the names
 /// that there are where it is none of them, or is empty.

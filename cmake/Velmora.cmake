@@ -9,8 +9,25 @@ if(VELMORA_SANITIZE)
     target_compile_options(velmora_options INTERFACE -fsanitize=address,undefined -fno-sanitize-recover=all
                            -fno-omit-frame-pointer)
     target_link_options(velmora_options INTERFACE -fsanitize=address,undefined)
+elseif(VELMORA_FUZZ)
+    # Every library counts what it runs through; the engine's main is linked to the fuzzers alone. The check of
+    # dynamic types is left out for speed.
+    target_compile_options(velmora_options INTERFACE -fsanitize=fuzzer-no-link,address,undefined
+                           -fno-sanitize=vptr -fno-sanitize-recover=all -fno-omit-frame-pointer)
+    target_link_options(velmora_options INTERFACE -fsanitize=address,undefined)
 elseif(CMAKE_BUILD_TYPE MATCHES "Rel")
-    target_compile_options(velmora_options INTERFACE -U_FORTIFY_SOURCE -D_FORTIFY_SOURCE=2)
+    target_compile_options(velmora_options INTERFACE -U_FORTIFY_SOURCE -D_FORTIFY_SOURCE=2 -fstack-clash-protection)
+    if(CMAKE_SYSTEM_PROCESSOR MATCHES "x86_64|i.86")
+        target_compile_options(velmora_options INTERFACE -fcf-protection)
+    elseif(CMAKE_SYSTEM_PROCESSOR MATCHES "aarch64")
+        target_compile_options(velmora_options INTERFACE -mbranch-protection=standard)
+    endif()
+    # Where it was built is nobody's business and would make two builds of one source differ. The build tree comes
+    # last, since it may lie in the source tree and the last one that fits counts.
+    target_compile_options(velmora_options INTERFACE -ffile-prefix-map=${PROJECT_SOURCE_DIR}=.
+                           -ffile-prefix-map=${CMAKE_BINARY_DIR}=build)
+    # What a library is linked for but does not use would become a dependency of the package.
+    target_link_options(velmora_options INTERFACE -Wl,--as-needed)
 endif()
 
 # velmora_library(NAME SOURCES file... [LINK target...]): a static library; what it links is all it may include.
@@ -49,7 +66,8 @@ endfunction()
 # that each header is known to compile alone.
 function(velmora_header_check)
     file(GLOB_RECURSE headers CONFIGURE_DEPENDS RELATIVE ${PROJECT_SOURCE_DIR}
-         ${PROJECT_SOURCE_DIR}/App/*.h ${PROJECT_SOURCE_DIR}/LogGenerator/*.h ${PROJECT_SOURCE_DIR}/Model/*.h
+         ${PROJECT_SOURCE_DIR}/App/*.h ${PROJECT_SOURCE_DIR}/Fuzz/*.h ${PROJECT_SOURCE_DIR}/LogGenerator/*.h
+         ${PROJECT_SOURCE_DIR}/Model/*.h
          ${PROJECT_SOURCE_DIR}/Platform/*.h ${PROJECT_SOURCE_DIR}/Recording/*.h ${PROJECT_SOURCE_DIR}/Telephony/*.h
          ${PROJECT_SOURCE_DIR}/Tests/*.h ${PROJECT_SOURCE_DIR}/Toolkit/*.h ${PROJECT_SOURCE_DIR}/Tools/*.h)
     set(sources)

@@ -3,7 +3,11 @@
 namespace velmora {
 
 const char* programBuildStamp() {
+#ifdef VELMORA_BUILD_STAMP
+    return VELMORA_BUILD_STAMP;
+#else
     return __DATE__ " " __TIME__;
+#endif
 }
 
 } // namespace velmora

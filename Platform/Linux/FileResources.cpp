@@ -36,7 +36,9 @@ std::vector<std::filesystem::path> FileResources::standardDirectories() {
     if (const auto program = std::filesystem::read_symlink("/proc/self/exe", error); !error)
         add((program.parent_path() / "../share/velmora").lexically_normal());
     add(VELMORA_INSTALLED_RESOURCES);
+#ifdef VELMORA_SOURCE_RESOURCES
     add(VELMORA_SOURCE_RESOURCES);
+#endif
     return directories;
 }
 

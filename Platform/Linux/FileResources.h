@@ -15,7 +15,8 @@ public:
     explicit FileResources(std::vector<std::filesystem::path> directories = standardDirectories());
 
     /// $VELMORA_RESOURCES, $XDG_CONFIG_HOME/velmora (~/.config/velmora), share/velmora beside the
-    /// executable's directory, the installed data directory, the source tree's Resources/; each once.
+    /// executable's directory, the installed data directory, the source tree's Resources/ where the build was
+    /// told to look there; each once.
     [[nodiscard]] static std::vector<std::filesystem::path> standardDirectories();
 
     /// A resource that is there but cannot be read is a failure; the directories after it are not looked at.

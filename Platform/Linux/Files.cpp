@@ -2,33 +2,18 @@
 
 #include "Platform/Linux/Errno.h"
 #include "Platform/Linux/FileDescriptor.h"
+#include "Platform/Linux/FileDraft.h"
 
 #include <fcntl.h>
 #include <sys/stat.h>
 
 #include <algorithm>
 #include <cerrno>
-#include <cstdlib>
 #include <string>
 #include <utility>
 #include <vector>
 
 namespace velmora {
-
-namespace {
-
-Result<Done> writeAll(const FileDescriptor& file, Bytes content) {
-    while (!content.empty()) {
-        const auto count = ::write(file.get(), content.data(), content.size());
-        if (count >= 0)
-            content = content.subspan(static_cast<std::size_t>(count));
-        else if (errno != EINTR)
-            return Failure{"cannot be written: " + errnoText(errno)};
-    }
-    return Done();
-}
-
-} // namespace
 
 Result<Data> readFile(const std::filesystem::path& path, std::size_t maximumBytes) {
     FileDescriptor file(::open(path.c_str(), O_RDONLY | O_CLOEXEC));
@@ -57,32 +42,31 @@ Result<Data> readFile(const std::filesystem::path& path, std::size_t maximumByte
     return Data(std::move(content));
 }
 
+Result<Done> writeAll(int descriptor, Bytes content) {
+    while (!content.empty()) {
+        const auto count = ::write(descriptor, content.data(), content.size());
+        if (count >= 0)
+            content = content.subspan(static_cast<std::size_t>(count));
+        else if (errno != EINTR)
+            return Failure{"cannot be written: " + errnoText(errno)};
+    }
+    return Done();
+}
+
 Result<Done> writeFile(const std::filesystem::path& path, Bytes content) {
     FileDescriptor file(::open(path.c_str(), O_WRONLY | O_CREAT | O_TRUNC | O_CLOEXEC, 0666));
     if (!file)
         return Failure{"cannot be opened for writing: " + errnoText(errno)};
-    return writeAll(file, content);
+    return writeAll(file.get(), content);
 }
 
 Result<Done> replaceFile(const std::filesystem::path& path, Bytes content) {
-    std::string draft = path.string() + ".XXXXXX";
-    const FileDescriptor file(::mkostemp(draft.data(), O_CLOEXEC));
-    if (!file)
-        return Failure{"cannot be opened for writing: " + errnoText(errno)};
-    const auto fail = [&draft](Failure failure) {
-        ::unlink(draft.c_str());
-        return failure;
-    };
-    struct stat earlier = {};
-    const bool existed = ::stat(path.c_str(), &earlier) == 0;
-    if (existed && ::fchmod(file.get(), earlier.st_mode & 07777) != 0)
-        return fail({"cannot be given its permissions: " + errnoText(errno)});
-    if (const auto written = writeAll(file, content); !written)
-        return fail({written.reason()});
-    // The content is on the disk before the name leads to it.
-    if (::fsync(file.get()) != 0 || ::rename(draft.c_str(), path.c_str()) != 0)
-        return fail({"cannot be replaced: " + errnoText(errno)});
-    return Done();
+    Result<FileDraft> draft = FileDraft::create(path, S_IRUSR | S_IWUSR);
+    if (!draft)
+        return Failure{draft.reason()};
+    if (const auto written = writeAll(draft->descriptor(), content); !written)
+        return written;
+    return draft->publish(FileDraft::WhereThereIsOne::Replace);
 }
 
 } // namespace velmora

@@ -12,6 +12,9 @@ namespace velmora {
 /// stand behind "file: ".
 Result<Data> readFile(const std::filesystem::path& path, std::size_t maximumBytes);
 
+/// Writes all of it to an open file. The reason is as readFile's.
+Result<Done> writeAll(int descriptor, Bytes content);
+
 /// Makes the file, or replaces its content, byte after byte: who reads it meanwhile sees part of it, and a
 /// failure leaves what was written up to then. The reason is as readFile's.
 Result<Done> writeFile(const std::filesystem::path& path, Bytes content);

@@ -1,7 +1,13 @@
 #include "Tests/Platform/LinuxPortFixture.h"
 
 #include <gmock/gmock.h>
+#include <grp.h>
+#include <sys/socket.h>
+#include <sys/stat.h>
+#include <sys/wait.h>
+#include <unistd.h>
 
+#include <cerrno>
 #include <csignal>
 
 /// Ports between processes, and what is left when one of them crashes.
@@ -32,6 +38,36 @@ TEST_F(LinuxPortTest, ProcessesTalkToEachOther) {
     }
     echo.kill();
     EXPECT_FALSE(port->isValid());
+}
+
+TEST_F(LinuxPortTest, AnotherUsersProcessIsRefused) {
+    constexpr uid_t nobody = 65534;
+    if (::geteuid() != 0)
+        GTEST_SKIP() << "only root can run a process as another user";
+    // As open as a port directory can be, so that it is not the directory that keeps him out.
+    ASSERT_EQ(::chmod(_directory.path().c_str(), 0755), 0);
+    const auto port = listening("in");
+    ASSERT_EQ(::chmod(path("in").c_str(), 0777), 0);
+
+    const pid_t stranger = ::fork();
+    ASSERT_GE(stranger, 0);
+    if (stranger == 0) {
+        // Ends with 0 when he has been turned away: connected, but the other end is closed unread.
+        if (::setgroups(0, nullptr) != 0 || ::setgid(nobody) != 0 || ::setuid(nobody) != 0)
+            ::_exit(1);
+        const FileDescriptor socket = rawClient("in");
+        char byte = 0;
+        const auto got = ::recv(socket.get(), &byte, 1, 0);
+        ::_exit(got == 0 || (got < 0 && errno == ECONNRESET) ? 0 : 2);
+    }
+    EXPECT_TRUE(eventually([&] { return !_log.lines().empty(); }));
+    int status = 0;
+    ASSERT_EQ(::waitpid(stranger, &status, 0), stranger);
+    EXPECT_TRUE(WIFEXITED(status));
+    EXPECT_EQ(WEXITSTATUS(status), 0);
+    EXPECT_THAT(_messages, IsEmpty());
+    EXPECT_THAT(_log.lines(), ElementsAre(CapturedLog::Line{
+                                  3, "Message port in: refused a peer of user 65534, wanted user 0"}));
 }
 
 TEST_F(LinuxPortTest, AStoppedProcessRunsIntoTheTimeOutAndItsAnswerIsLate) {

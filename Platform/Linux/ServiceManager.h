@@ -1,0 +1,29 @@
+#pragma once
+
+#include <string>
+#include <string_view>
+
+namespace velmora {
+
+/// The service manager that started this program, as the program sees it: it is told how far the program has
+/// come, by datagrams to the socket that $NOTIFY_SOCKET names. Where the variable is not set nobody wants to
+/// know, and nothing is sent. What cannot be sent is an error line; the program goes on.
+class ServiceManager {
+public:
+    /// Takes the socket's name from the environment.
+    ServiceManager();
+    /// `address` is the absolute path of a socket, "@" and the name of an abstract one, or empty for none.
+    explicit ServiceManager(std::string address);
+
+    /// The program serves from now on; `status` is one line for who asks how it is.
+    void ready(std::string_view status) const;
+    /// The program is about to end, as it was asked to.
+    void stopping() const;
+
+private:
+    void send(std::string message) const;
+
+    std::string _address;
+};
+
+} // namespace velmora
