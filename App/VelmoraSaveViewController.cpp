@@ -2,6 +2,7 @@
 
 #include "App/VelmoraApp.h"
 #include "App/VelmoraSaveView.h"
+#include "Model/Snapshot.h"
 #include "Platform/PropertyList.h"
 #include "Platform/SystemLog.h"
 #include "Toolkit/Alert.h"
@@ -9,7 +10,7 @@
 #include "Toolkit/TableCell.h"
 
 #include <chrono>
-#include <initializer_list>
+#include <new>
 #include <utility>
 
 namespace velmora {
@@ -18,17 +19,6 @@ namespace {
 
 constexpr const char* cellIdentifier = "SaveHistoryContentCell";
 constexpr double cellFontSize = 13;
-
-/// A dictionary of the pairs in their order, which ends before the first whose value is missing.
-DictionaryRef dictionaryOfPairs(std::initializer_list<Dictionary::Entry> pairs) {
-    const auto dictionary = makeDictionary();
-    for (const auto& [key, value] : pairs) {
-        if (value.isNone())
-            break;
-        dictionary->set(key, value);
-    }
-    return dictionary;
-}
 
 } // namespace
 
@@ -68,13 +58,6 @@ void VelmoraSaveViewController::viewDidUnload() {
     ViewController::viewDidUnload();
 }
 
-DictionaryRef VelmoraSaveViewController::snapshot() const {
-    // Without a decoder there is no data, and so neither data nor what comes after it.
-    return dictionaryOfPairs({{"Timestamp", dateDescription(_timeStamp)},
-                              {"Data", _saveHistory ? Value(_saveHistory) : Value()},
-                              {"Description", _saveDescription.text()}});
-}
-
 std::string VelmoraSaveViewController::snapshotPath() const {
     // By the second, so that a second save within it replaces the first.
     const auto now = std::chrono::floor<std::chrono::seconds>(_app.platform().model().clock.now());
@@ -83,11 +66,20 @@ std::string VelmoraSaveViewController::snapshotPath() const {
 }
 
 bool VelmoraSaveViewController::writeSnapshot(const std::string& path) const {
-    const auto list = writeXMLPropertyList(snapshot());
-    const auto written = list ? _app.platform().files().writeDirectly(path, *list) : Failure{list.reason()};
-    if (!written)
-        logFormat(LogPriority::Info, "Snapshot: %s", written.reason().c_str());
-    return static_cast<bool>(written);
+    try {
+        const auto list =
+            writeXMLPropertyList(makeSnapshot(_timeStamp, _saveHistory, _saveDescription.text()));
+        const auto written =
+            list ? _app.platform().files().writeDirectly(path, *list) : Failure{list.reason()};
+        if (!written)
+            logFormat(LogPriority::Info, "Snapshot: %s", written.reason().c_str());
+        return static_cast<bool>(written);
+    } catch (const std::bad_alloc&) {
+        // A long history is written as one text. What there is no room for ends neither the display nor the
+        // log.
+        logLine(LogPriority::Info, "Snapshot: out of memory");
+        return false;
+    }
 }
 
 void VelmoraSaveViewController::savePressed() {

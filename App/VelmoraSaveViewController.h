@@ -54,9 +54,8 @@ protected:
     [[nodiscard]] std::unique_ptr<View> loadView() override;
 
 private:
-    /// The snapshot with what the field says now.
-    [[nodiscard]] DictionaryRef snapshot() const;
     [[nodiscard]] std::string snapshotPath() const;
+    /// With what the field says now.
     [[nodiscard]] bool writeSnapshot(const std::string& path) const;
     void queueClosing();
 

@@ -20,6 +20,12 @@ void Base::updateSectionRef(const Value& node) {
     logLine(LogPriority::Warning, getSectionName());
 }
 
+Value Base::node() const {
+    if (DictionaryRef dictionary = _dictionaryRef.lock())
+        return dictionary;
+    return _arrayRef.lock();
+}
+
 void Base::updateLogCodeDict(CodeDictionary& codeDict) {
     const std::vector<std::uint32_t> codes = getLogCodeArray();
     logFormat(LogPriority::Warning, "Array Count: %d", static_cast<int>(codes.size()));

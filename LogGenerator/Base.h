@@ -48,6 +48,8 @@ public:
 
     /// Hands the section its node, a dictionary or an array.
     void updateSectionRef(const Value& node);
+    /// The node; none before the display is built and once it is gone.
+    [[nodiscard]] Value node() const;
     /// Appends this section to the subscribers of each of its codes: a code listed twice is subscribed twice.
     void updateLogCodeDict(CodeDictionary& codeDict);
 

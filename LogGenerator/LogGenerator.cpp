@@ -3,6 +3,7 @@
 #include "LogGenerator/C2K/C2KLogGenerator.h"
 #include "LogGenerator/GSM/GSMLogGenerator.h"
 #include "LogGenerator/LTE/LTELogGenerator.h"
+#include "LogGenerator/MessageEffects.h"
 #include "LogGenerator/OstrelGSM/Ostrel_GSMLogGenerator.h"
 #include "LogGenerator/UTRAN/UTRANLogGenerator.h"
 #include "Platform/SystemLog.h"
@@ -19,6 +20,11 @@ constexpr std::int32_t keptBeforeNew = 4;
 
 LogGenerator::LogGenerator(const Clock& clock) : _clock(clock) {
     logFormat(LogPriority::Warning, "Creating Log object: %p", static_cast<void*>(this));
+}
+
+void LogGenerator::updateStateTelling(Dictionary& state, const Data& data, MessageEffects& effects) {
+    updateState(state, data);
+    effects.display(state["Display"]);
 }
 
 std::unique_ptr<LogGenerator> LogGenerator::generatorFromTechnology(std::string_view technology,

@@ -8,6 +8,8 @@
 
 namespace velmora {
 
+class MessageEffects;
+
 /// A technology's log decoder, as the model speaks to it. Decoders keep what they decode in the state
 /// dictionary that every call is given: the model owns it and it outlives them, so that a new decoder starts
 /// with what the earlier one left there. Main thread only.
@@ -25,6 +27,9 @@ public:
 
     /// Decodes one log message into the state. Called for every message.
     virtual void updateState(Dictionary& state, const Data& data) = 0;
+    /// `updateState`, and tells what the message concerned. A decoder that does not override this tells of
+    /// the display as a whole.
+    virtual void updateStateTelling(Dictionary& state, const Data& data, MessageEffects& effects);
     /// The display for the current state, or none when there is nothing to show yet; appends a history entry.
     /// Called once per redraw with new data.
     [[nodiscard]] virtual Value generateLogUsingState(Dictionary& state) = 0;

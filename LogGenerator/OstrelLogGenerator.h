@@ -1,10 +1,10 @@
 #pragma once
 
 #include "LogGenerator/LogGenerator.h"
+#include "Platform/DLFVersionReport.h"
 
 #include <cstdint>
 #include <optional>
-#include <span>
 #include <vector>
 
 namespace velmora {
@@ -29,17 +29,5 @@ protected:
     /// Moves the raw messages into the state under "DisplayState" and starts collecting anew.
     void handOverBinData(Dictionary& state);
 };
-
-/// The size of a DLF log's first record.
-inline constexpr std::size_t dlfVersionReportSize = 161;
-
-/// Writes a DLF log's version report into `buffer` and its size into `written`; 0 on success. A buffer that
-/// is too short gets nothing, `written` becomes 0 and the result is 3. `packedTime`: seconds since 1970 in
-/// the low 32 bits, then the zone's offset in minutes (16), then 1 while daylight-saving time is in effect
-/// (8). Texts that do not fit their field are cut, as the format has it.
-[[nodiscard]] int DLFAddVersionReport(std::span<std::uint8_t> buffer, std::size_t& written,
-                                      std::uint16_t firstReport, std::uint16_t secondReport,
-                                      std::string_view version, std::string_view executable,
-                                      std::string_view build, std::uint64_t packedTime);
 
 } // namespace velmora

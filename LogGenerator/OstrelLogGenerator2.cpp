@@ -1,9 +1,11 @@
 #include "LogGenerator/OstrelLogGenerator2.h"
 
+#include "LogGenerator/MessageEffects.h"
 #include "Platform/PropertyList.h"
 #include "Platform/Resources.h"
 #include "Platform/SystemLog.h"
 
+#include <algorithm>
 #include <charconv>
 
 namespace velmora {
@@ -59,25 +61,48 @@ void OstrelLogGenerator2::updateState(Dictionary& state, const Data& data) {
     // Builds the display on the first message; what it returns is of no use here.
     static_cast<void>(getDisplayFromState(state));
     updateWithData(data);
-    // Every message is kept for the log, routed or not, with its prefix.
-    const Bytes bytes = data.bytes();
+    keep(data);
+}
+
+void OstrelLogGenerator2::updateStateTelling(Dictionary& state, const Data& data, MessageEffects& effects) {
+    static_cast<void>(getDisplayFromState(state));
+    const std::optional<std::uint32_t> code = route(data);
+    keep(data);
+    effects.sections(code);
+    const std::vector<Base*>* subscribers = code ? cIndex->getSubscribers(*code) : nullptr;
+    if (!subscribers)
+        return;
+    for (auto section = subscribers->begin(); section != subscribers->end(); ++section)
+        // A section that lists a code twice is called twice, and told of once.
+        if (std::find(subscribers->begin(), section, *section) == section)
+            if (const Value node = (*section)->node(); !node.isNone())
+                effects.section((*section)->getSectionName(), node);
+}
+
+void OstrelLogGenerator2::keep(const Data& message) {
+    const Bytes bytes = message.bytes();
     _binData.insert(_binData.end(), bytes.begin(), bytes.end());
 }
 
 void OstrelLogGenerator2::updateWithData(const Data& message) {
+    static_cast<void>(route(message));
+}
+
+std::optional<std::uint32_t> OstrelLogGenerator2::route(const Data& message) {
     if (message.size() < headerLength)
-        return;
+        return std::nullopt;
     const Data data = message.bytes().front() == prefixMarker ? message.from(prefixLength) : message;
     const Record record(data);
     const std::uint8_t type = record.u8(0);
     if (type != basebandType && type != extraType) {
         logFormat(LogPriority::Error, "Invalid log type: %x. Dropping.", static_cast<unsigned>(type));
-        return;
+        return std::nullopt;
     }
     const std::uint32_t code = record.u16(3) + (type == extraType ? firstExtraCode : 0);
     if (const std::vector<Base*>* subscribers = cIndex->getSubscribers(code))
         for (Base* section : *subscribers)
             section->updateWithData(data, code);
+    return code;
 }
 
 Value OstrelLogGenerator2::getDisplayFromState(Dictionary& state) {

@@ -3,7 +3,9 @@
 #include "LogGenerator/ClassIndex.h"
 #include "LogGenerator/OstrelLogGenerator.h"
 
+#include <cstdint>
 #include <memory>
+#include <optional>
 #include <string>
 
 namespace velmora {
@@ -21,6 +23,8 @@ public:
     ~OstrelLogGenerator2() override;
 
     void updateState(Dictionary& state, const Data& data) override;
+    /// Tells of the sections that want the message's code.
+    void updateStateTelling(Dictionary& state, const Data& data, MessageEffects& effects) override;
     [[nodiscard]] Value generateLogUsingState(Dictionary& state) override;
     [[nodiscard]] DictionaryRef getStartCommand() const override;
 
@@ -42,6 +46,10 @@ public:
     [[nodiscard]] const ClassIndex& classIndex() const { return *cIndex; }
 
 private:
+    /// Does what `updateWithData` does. Gives the code; none for a message that was dropped.
+    std::optional<std::uint32_t> route(const Data& message);
+    /// Every message is kept for the log, routed or not, with its prefix.
+    void keep(const Data& message);
     /// Gives the sections of this decoder their nodes of a display that an earlier decoder built.
     void adoptDisplay(const Value& display);
 

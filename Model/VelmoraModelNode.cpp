@@ -9,17 +9,7 @@ namespace velmora {
 
 namespace {
 
-constexpr std::string_view sortedMarker = "_sorted";
-
 NodeRef build(std::string name, const Value& object, std::string path, PathDictionary& paths);
-
-/// The name that a key of a sorted dictionary shows: what follows its one ";", else the whole key.
-std::string_view nameOfSortedKey(std::string_view key) {
-    const std::size_t first = key.find(';');
-    if (first == std::string_view::npos || key.find(';', first + 1) != std::string_view::npos)
-        return key;
-    return key.substr(first + 1);
-}
 
 std::vector<NodeRef> childrenOf(const Dictionary& dictionary, const std::string& path,
                                 PathDictionary& paths) {
@@ -72,6 +62,13 @@ NodeRef build(std::string name, const Value& object, std::string path, PathDicti
 }
 
 } // namespace
+
+std::string_view nameOfSortedKey(std::string_view key) {
+    const std::size_t first = key.find(';');
+    if (first == std::string_view::npos || key.find(';', first + 1) != std::string_view::npos)
+        return key;
+    return key.substr(first + 1);
+}
 
 NodeRef VelmoraModelNode::makeTreeFromObject(const Value& object, PathDictionary& paths) {
     return build("Velmora", object, std::string(rootNodePath), paths);

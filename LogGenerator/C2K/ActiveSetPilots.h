@@ -8,6 +8,7 @@ namespace velmora::C2K {
 class ActiveSetPilots final : public LogCodeParser {
 public:
     [[nodiscard]] std::uint16_t logCode() const override { return 0x12B6; }
+    [[nodiscard]] std::string_view name() const override { return "Active-set pilots"; }
     void parse(const Record& record, Dictionary& state, const Publisher& publisher) const override;
 };
 

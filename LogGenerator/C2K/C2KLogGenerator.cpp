@@ -1,6 +1,7 @@
 #include "LogGenerator/C2K/C2KLogGenerator.h"
 
 #include "LogGenerator/C2K/LogCodeParsers.h"
+#include "LogGenerator/MessageEffects.h"
 #include "Platform/PropertyList.h"
 #include "Platform/Resources.h"
 #include "Platform/SystemLog.h"
@@ -70,15 +71,27 @@ DictionaryRef C2KLogGenerator::getStartCommand() const {
 }
 
 void C2KLogGenerator::updateState(Dictionary& state, const Data& data) {
+    update(state, data, nullptr);
+}
+
+void C2KLogGenerator::updateStateTelling(Dictionary& state, const Data& data, MessageEffects& effects) {
+    update(state, data, &effects);
+}
+
+void C2KLogGenerator::update(Dictionary& state, const Data& data, MessageEffects* effects) {
     // Builds the display on the first message.
     static_cast<void>(getDisplayFromState(state));
     const DictionaryRef lookup = state["Lookup"].dictionaryRef();
-    updateFromLog(data, lookup.get(), state);
+    updateFromLog(data, lookup.get(), state, effects);
 }
 
-void C2KLogGenerator::updateFromLog(const Data& data, const Dictionary* lookup, Dictionary& state) {
-    if (data.size() < headerLength)
+void C2KLogGenerator::updateFromLog(const Data& data, const Dictionary* lookup, Dictionary& state,
+                                    MessageEffects* effects) {
+    if (data.size() < headerLength) {
+        if (effects)
+            effects->values(std::nullopt);
         return;
+    }
     const Data stripped = data.bytes().front() == prefixMarker ? data.from(prefixLength) : data;
     const Record record(stripped);
     const std::uint8_t type = record.u8(0);
@@ -87,10 +100,12 @@ void C2KLogGenerator::updateFromLog(const Data& data, const Dictionary* lookup, 
     if (type != basebandType)
         logFormat(LogPriority::Error, "Invalid log type: %x. Dropping.", static_cast<unsigned>(type));
     const std::uint32_t code = record.u16(3) + (type == extraType ? firstExtraCode : 0);
+    if (effects)
+        effects->values(code);
     const C2K::LogCodeParser* parser = C2K::parserOfCode(code);
     if (!parser)
         return;
-    parser->parse(record, state, C2K::Publisher(lookup));
+    parser->parse(record, state, C2K::Publisher(lookup, effects));
     const Bytes bytes = stripped.bytes();
     _binData.insert(_binData.end(), bytes.begin(), bytes.end());
 }

@@ -20,12 +20,16 @@ public:
 
     [[nodiscard]] DictionaryRef getStartCommand() const override;
     void updateState(Dictionary& state, const Data& data) override;
+    /// Tells of the values that the message published.
+    void updateStateTelling(Dictionary& state, const Data& data, MessageEffects& effects) override;
     [[nodiscard]] Value generateLogUsingState(Dictionary& state) override;
 
     /// Decodes one message and keeps its record, less prefix, for the log where its code is one of the eight,
     /// whether or not the parser accepted it. `lookup`: null where the display could not be built; then the
-    /// parsers show nothing. A message below 13 bytes as it arrived is dropped silently.
-    void updateFromLog(const Data& data, const Dictionary* lookup, Dictionary& state);
+    /// parsers show nothing. A message below 13 bytes as it arrived is dropped silently. `effects`, unless
+    /// null, is told of the values.
+    void updateFromLog(const Data& data, const Dictionary* lookup, Dictionary& state,
+                       MessageEffects* effects = nullptr);
 
     /// Fills display and lookup from a template: a dictionary becomes a sub-screen, "_sorted" is copied, any
     /// other string is the value key that its label shows and an empty text until there is a value. Values of
@@ -35,6 +39,9 @@ public:
     /// The state's display, which the first call builds; none, with an error line, where there is no template
     /// (it is looked for again on the next call).
     [[nodiscard]] static Value getDisplayFromState(Dictionary& state);
+
+private:
+    void update(Dictionary& state, const Data& data, MessageEffects* effects);
 };
 
 } // namespace velmora

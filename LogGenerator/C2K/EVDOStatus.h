@@ -8,6 +8,7 @@ namespace velmora::C2K {
 class EVDOStatus final : public LogCodeParser {
 public:
     [[nodiscard]] std::uint16_t logCode() const override { return 0x1183; }
+    [[nodiscard]] std::string_view name() const override { return "EV-DO status"; }
     void parse(const Record& record, Dictionary& state, const Publisher& publisher) const override;
 };
 

@@ -8,6 +8,7 @@ namespace velmora::C2K {
 class ForwardLinkDataRate final : public LogCodeParser {
 public:
     [[nodiscard]] std::uint16_t logCode() const override { return 0x1192; }
+    [[nodiscard]] std::string_view name() const override { return "Forward-link data rate"; }
     void parse(const Record& record, Dictionary& state, const Publisher& publisher) const override;
 };
 

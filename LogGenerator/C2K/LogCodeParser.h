@@ -4,6 +4,7 @@
 #include "LogGenerator/Record.h"
 
 #include <cstdint>
+#include <string_view>
 
 namespace velmora::C2K {
 
@@ -16,6 +17,8 @@ public:
     LogCodeParser& operator=(const LogCodeParser&) = delete;
 
     [[nodiscard]] virtual std::uint16_t logCode() const = 0;
+    /// What people call such records.
+    [[nodiscard]] virtual std::string_view name() const = 0;
     /// Decodes one record, prefix removed, of whatever length. One that is rejected is one log line: it
     /// publishes nothing and leaves the state alone.
     virtual void parse(const Record& record, Dictionary& state, const Publisher& publisher) const = 0;

@@ -1,8 +1,12 @@
 #include "LogGenerator/C2K/Publisher.h"
 
+#include "LogGenerator/MessageEffects.h"
+
 namespace velmora::C2K {
 
 void Publisher::publish(std::string_view valueKey, const Value& value) const {
+    if (_effects)
+        _effects->value(valueKey, value);
     const ArrayRef targets = _lookup ? (*_lookup)[valueKey].arrayRef() : nullptr;
     if (!targets)
         return;

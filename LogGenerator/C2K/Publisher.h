@@ -5,6 +5,10 @@
 
 #include <string_view>
 
+namespace velmora {
+class MessageEffects;
+}
+
 namespace velmora::C2K {
 
 /// Puts a parser's values on the screens. A value goes by its value key ("kChannel"); the lookup tells under
@@ -12,8 +16,10 @@ namespace velmora::C2K {
 /// display dictionary that holds it}. Refers to the lookup, which must outlive it.
 class Publisher {
 public:
-    /// Without a lookup nothing is shown anywhere.
-    explicit Publisher(const Dictionary* lookup) : _lookup(lookup) {}
+    /// Without a lookup nothing is shown anywhere. `effects`, unless null, is told of every value, shown or
+    /// not.
+    explicit Publisher(const Dictionary* lookup, MessageEffects* effects = nullptr)
+        : _lookup(lookup), _effects(effects) {}
 
     /// Shows the value under every label of the key, in the lookup's order. A target whose "dict" is no
     /// dictionary that can be changed, or whose "key" is no string, ends it: the targets behind it keep what
@@ -25,6 +31,7 @@ public:
 
 private:
     const Dictionary* _lookup;
+    MessageEffects* _effects;
 };
 
 } // namespace velmora::C2K

@@ -8,6 +8,7 @@ namespace velmora::C2K {
 class ReverseLinkDataRate final : public LogCodeParser {
 public:
     [[nodiscard]] std::uint16_t logCode() const override { return 0x127E; }
+    [[nodiscard]] std::string_view name() const override { return "Reverse-link data rate"; }
     void parse(const Record& record, Dictionary& state, const Publisher& publisher) const override;
 };
 

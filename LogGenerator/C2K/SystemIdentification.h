@@ -8,6 +8,7 @@ namespace velmora::C2K {
 class SystemIdentification final : public LogCodeParser {
 public:
     [[nodiscard]] std::uint16_t logCode() const override { return 0x134F; }
+    [[nodiscard]] std::string_view name() const override { return "System identification"; }
     void parse(const Record& record, Dictionary& state, const Publisher& publisher) const override;
 };
 

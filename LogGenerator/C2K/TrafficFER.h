@@ -9,6 +9,7 @@ namespace velmora::C2K {
 class TrafficFER final : public LogCodeParser {
 public:
     [[nodiscard]] std::uint16_t logCode() const override { return 0x119D; }
+    [[nodiscard]] std::string_view name() const override { return "Traffic FER"; }
     void parse(const Record& record, Dictionary& state, const Publisher& publisher) const override;
 };
 

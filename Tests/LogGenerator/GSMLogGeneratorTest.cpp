@@ -3,6 +3,7 @@
 #include "LogGenerator/AssertionFailure.h"
 #include "Platform/PropertyList.h"
 #include "Tests/Support/FakeClock.h"
+#include "Tests/Support/NotedEffects.h"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
@@ -123,6 +124,17 @@ TEST_F(GSMLogGeneratorTest, EachMessageReplacesTheWholeDisplay) {
     EXPECT_EQ(state["DisplayState"], Value(dictionary({{"Cell", dictionary({{"ARFCN", "12"}})}})));
     EXPECT_EQ(state["Display"], Value(dictionary({{"Cell", "12"}})));
     EXPECT_EQ(state["ExtraInfo"], Value(makeDictionary()));
+}
+
+TEST_F(GSMLogGeneratorTest, MessageConcernsTheWholeDisplay) {
+    NotedEffects effects;
+    generator.updateStateTelling(state, Data(*writeBinaryPropertyList(dictionary({{"Band", "900"}}))),
+                                 effects);
+    EXPECT_EQ(effects.kind, NotedEffects::Kind::Display);
+    EXPECT_EQ(effects.messages, 1);
+    ASSERT_EQ(effects.members.size(), 1U);
+    EXPECT_EQ(effects.members[0].second.asDictionary(), state["Display"].asDictionary());
+    EXPECT_EQ(state["Display"], Value(dictionary({{"Band", "900"}})));
 }
 
 TEST_F(GSMLogGeneratorTest, ReadsTheBinaryForm) {

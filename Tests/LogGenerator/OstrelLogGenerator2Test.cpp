@@ -4,6 +4,7 @@
 #include "Tests/Support/FakeClock.h"
 #include "Tests/Support/FakeResources.h"
 #include "Tests/Support/Hex.h"
+#include "Tests/Support/NotedEffects.h"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
@@ -109,6 +110,72 @@ std::vector<std::uint32_t> codesOf(const Listener& section) {
     for (const auto& call : section.calls)
         codes.push_back(call.code);
     return codes;
+}
+
+TEST_P(FramingTest, TellingOfItDoesTheSame) {
+    log.clear();
+    const Data message = hex(GetParam().bytes);
+    NotedEffects effects;
+    generator.updateStateTelling(state, message, effects);
+    EXPECT_EQ(codesOf(index->baseband), GetParam().basebandCodes);
+    EXPECT_EQ(codesOf(index->extra), GetParam().extraCodes);
+    EXPECT_EQ(log.textsAt(LogPriority::Error), GetParam().errors);
+    EXPECT_EQ(raw(), message);
+    EXPECT_EQ(effects.kind, NotedEffects::Kind::Sections);
+    EXPECT_EQ(effects.messages, 1);
+    for (const std::vector<std::uint32_t>& codes : {GetParam().basebandCodes, GetParam().extraCodes})
+        if (!codes.empty()) {
+            EXPECT_EQ(effects.code, codes[0]);
+        }
+    if (!GetParam().errors.empty()) {
+        EXPECT_EQ(effects.code, std::nullopt);
+    }
+}
+
+TEST_F(TemplateTest, SectionsOfACodeAreToldWithTheirNodesAsTheyThenStand) {
+    NotedEffects effects;
+    generator.updateStateTelling(state, record(0x1234, "00 00"), effects);
+    EXPECT_EQ(effects.code, 0x1234U);
+    ASSERT_EQ(effects.members.size(), 2U);
+    EXPECT_EQ(effects.members[0].first, "RRC Info");
+    const Dictionary* radio = display()["Radio"].asDictionary();
+    EXPECT_EQ(effects.members[0].second.asDictionary(), (*radio)["RRC Info"].asDictionary());
+    EXPECT_EQ((*effects.members[0].second.asDictionary())["Length"], Value("15"));
+    EXPECT_EQ(effects.members[1].first, "Rows");
+    EXPECT_EQ(effects.members[1].second.asArray(), (*radio)["Rows"].asArray());
+
+    generator.updateStateTelling(state, record(2, "", 0xFF), effects);
+    EXPECT_EQ(effects.code, 0xFF0002U);
+    ASSERT_EQ(effects.members.size(), 1U);
+    EXPECT_EQ(effects.members[0].first, "SIM Info");
+
+    generator.updateStateTelling(state, record(0x1235, ""), effects); // nobody wants it
+    EXPECT_EQ(effects.code, 0x1235U);
+    EXPECT_THAT(effects.members, IsEmpty());
+    generator.updateStateTelling(state, hex("01 02"), effects);
+    EXPECT_EQ(effects.code, std::nullopt);
+    EXPECT_THAT(effects.members, IsEmpty());
+}
+
+TEST_F(TemplateTest, SectionOfACodeListedTwiceIsToldOnceAndOneWithoutANodeIsNot) {
+    class OddIndex final : public ClassIndex {
+    public:
+        OddIndex() {
+            for (Listener* section : {&twice, &nowhere})
+                section->initWithDict(classDict, codeDictionary);
+        }
+        Listener twice{"RRC Info", {0x1234, 0x1234}};
+        Listener nowhere{"Elsewhere", {0x1234}};
+    };
+    const auto odd = std::make_shared<OddIndex>();
+    OstrelLogGenerator2 other("Probe", odd, clock);
+    NotedEffects effects;
+    Dictionary fresh;
+    other.updateStateTelling(fresh, record(0x1234, ""), effects);
+    EXPECT_EQ(odd->twice.calls.size(), 2U);
+    EXPECT_EQ(odd->nowhere.calls.size(), 1U);
+    ASSERT_EQ(effects.members.size(), 1U);
+    EXPECT_EQ(effects.members[0].first, "RRC Info");
 }
 
 TEST_P(FramingTest, RoutesByTypeAndCodeAndKeepsEveryMessage) {

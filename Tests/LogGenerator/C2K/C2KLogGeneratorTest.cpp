@@ -6,6 +6,7 @@
 #include "Tests/Support/FakeClock.h"
 #include "Tests/Support/FakeResources.h"
 #include "Tests/Support/Hex.h"
+#include "Tests/Support/NotedEffects.h"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
@@ -177,6 +178,50 @@ TEST_F(C2KLogGeneratorTest, Framing) {
         EXPECT_EQ(update(message.bytes), message.lines);
         EXPECT_EQ(display(), message.decoded ? fingersShown : emptyDisplay);
         EXPECT_EQ(raw(), message.keptFrom ? message.bytes.from(*message.keptFrom) : Data());
+    }
+}
+
+TEST_F(C2KLogGeneratorTest, ValuesThatAMessagePublishesAreTold) {
+    build();
+    const CapturedLog log;
+    NotedEffects effects;
+    generator->updateStateTelling(state, noFingers(), effects);
+    EXPECT_EQ(effects.kind, NotedEffects::Kind::Values);
+    EXPECT_EQ(effects.code, 0x108AU);
+    EXPECT_THAT(effects.members, ElementsAre(std::pair<std::string, Value>("kFingerC2I", "(none)")));
+    EXPECT_EQ(display(), fingersShown);
+
+    // The system identification, in publishing order; the template has labels for none of it.
+    Data identification = recordWith(0x134F, 186);
+    std::vector<std::uint8_t> bytes(identification.bytes().begin(), identification.bytes().end());
+    bytes[13] = 2;  // version
+    bytes[46] = 2;  // system type
+    bytes[50] = 7;  // SID
+    bytes[131] = 9; // packet zone
+    generator->updateStateTelling(state, Data(std::move(bytes)), effects);
+    EXPECT_EQ(effects.code, 0x134FU);
+    std::vector<std::string> values;
+    for (const auto& [key, value] : effects.members)
+        values.push_back(key + "=" + *value.asString());
+    EXPECT_THAT(values, ElementsAre("k1xRoamingHome=OFF [0]", "kSystemId=7", "kNetworkId=0",
+                                    "kPacketZoneId=9", "kBaseId=0", "kProtocolRevision=0"));
+
+    struct Dropped {
+        Data message;
+        std::optional<std::uint32_t> code;
+    };
+    const Dropped dropped[] = {
+        {recordWith(0x1183, 13), 0x1183U}, // too short for its parser
+        {record(0x1234, ""), 0x1234U},     // no parser
+        {record(0x108A, "", 0xFF), 0xFF108AU},
+        {hex("01 02 03"), std::nullopt},
+    };
+    int told = 2;
+    for (const Dropped& row : dropped) {
+        generator->updateStateTelling(state, row.message, effects);
+        EXPECT_EQ(effects.messages, ++told);
+        EXPECT_EQ(effects.code, row.code);
+        EXPECT_THAT(effects.members, IsEmpty());
     }
 }
 

@@ -1,0 +1,39 @@
+#pragma once
+
+#include "LogGenerator/MessageEffects.h"
+
+#include <string>
+#include <utility>
+#include <vector>
+
+namespace velmora {
+
+/// What a decoder has told of messages: the latest message's code and the names and values, in order.
+class NotedEffects final : public MessageEffects {
+public:
+    enum class Kind { None, Sections, Values, Display };
+
+    Kind kind = Kind::None;
+    int messages = 0; ///< how many have been told of
+    std::optional<std::uint32_t> code;
+    std::vector<std::pair<std::string, Value>> members;
+
+    void sections(std::optional<std::uint32_t> messageCode) override { begin(Kind::Sections, messageCode); }
+    void section(std::string_view name, const Value& node) override { members.emplace_back(name, node); }
+    void values(std::optional<std::uint32_t> messageCode) override { begin(Kind::Values, messageCode); }
+    void value(std::string_view key, const Value& value) override { members.emplace_back(key, value); }
+    void display(const Value& display) override {
+        begin(Kind::Display, std::nullopt);
+        members.emplace_back("", display);
+    }
+
+private:
+    void begin(Kind newKind, std::optional<std::uint32_t> messageCode) {
+        kind = newKind;
+        ++messages;
+        code = messageCode;
+        members.clear();
+    }
+};
+
+} // namespace velmora
