@@ -1,3 +1,4 @@
+#include "Recording/DescriptorFile.h"
 #include "Recording/RecordingReader.h"
 #include "Recording/RecordingWriter.h"
 
@@ -7,10 +8,12 @@
 #include <cstring>
 #include <deque>
 #include <memory>
+#include <string>
 #include <utility>
 #include <vector>
 
 #include <benchmark/benchmark.h>
+#include <fcntl.h>
 #include <sys/mman.h>
 #include <unistd.h>
 
@@ -110,6 +113,36 @@ void BM_ReadHolding(benchmark::State& state) {
     });
 }
 BENCHMARK(BM_ReadHolding)->Unit(benchmark::kMillisecond);
+
+/// How long a recorder's event loop stands still to have 64 KiB put on the disk of the working directory.
+template <class Save>
+void save(benchmark::State& state, Save save) {
+    const std::string path = "recording-benchmark-" + std::to_string(::getpid());
+    const int descriptor = ::open(path.c_str(), O_WRONLY | O_CREAT | O_EXCL | O_CLOEXEC, 0600);
+    require(descriptor >= 0);
+    ::unlink(path.c_str());
+    DescriptorFile file(descriptor, true);
+    const std::vector<std::uint8_t> blocks(std::size_t{64} << 10, 0x5A);
+    for (auto _ : state) {
+        state.PauseTiming();
+        require(file.write(blocks).bytes == blocks.size());
+        state.ResumeTiming();
+        save(file);
+        state.PauseTiming();
+        require(file.sync() == 0); // so that every round finds the disk at rest
+        state.ResumeTiming();
+    }
+}
+
+void BM_SaveStarting(benchmark::State& state) {
+    save(state, [](DescriptorFile& file) { file.startSync(); });
+}
+BENCHMARK(BM_SaveStarting)->Unit(benchmark::kMicrosecond)->UseRealTime()->Iterations(100);
+
+void BM_SaveWaiting(benchmark::State& state) {
+    save(state, [](DescriptorFile& file) { require(file.sync() == 0); });
+}
+BENCHMARK(BM_SaveWaiting)->Unit(benchmark::kMicrosecond)->UseRealTime()->Iterations(100);
 
 } // namespace
 } // namespace velmora

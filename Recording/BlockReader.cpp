@@ -1,6 +1,7 @@
 #include "Recording/BlockReader.h"
 
 #include "Recording/FieldReader.h"
+#include "Recording/InputBegin.h"
 #include "Recording/Pcapng.h"
 
 #include <algorithm>
@@ -51,16 +52,9 @@ Result<Done> BlockReader::expectSection() {
     const Bytes begin = _input.available();
     if (_input.failure())
         return *_input.failure();
-    if (begin.empty())
-        return Failure{"empty, wanted a pcapng section header"};
     Block block;
-    if (!whole || FieldReader(begin, false).u32(0) != SectionHeader || examine(block) == Fault::NoByteOrder) {
-        std::string found;
-        constexpr char digits[] = "0123456789ABCDEF";
-        for (const std::uint8_t byte : begin.first(std::min(begin.size(), pcapng::blockOverhead)))
-            found += {digits[byte >> 4], digits[byte & 0xF], ' '};
-        return Failure{"begins " + found + "(hex), wanted a pcapng section header"};
-    }
+    if (!whole || FieldReader(begin, false).u32(0) != SectionHeader || examine(block) == Fault::NoByteOrder)
+        return Failure{unexpectedBegin(begin, "a pcapng section header")};
     return Done{};
 }
 

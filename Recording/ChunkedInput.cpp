@@ -18,8 +18,11 @@ ChunkedInput::ChunkedInput(std::unique_ptr<ByteSource> source, std::size_t chunk
 
 bool ChunkedInput::fill(std::size_t count) {
     while (_end - _begin < count && !_ended) {
-        if (_chunk->size() - _begin < count || _chunk->size() - _end < smallestRead)
-            turnOver(count);
+        // Room for what has come and as much again, not for all that a block's header announces: a few bytes
+        // that promise megabytes must not cost them.
+        const std::size_t wanted = std::min(count, std::max(2 * (_end - _begin), _chunkSize));
+        if (_chunk->size() - _begin < wanted || _chunk->size() - _end < smallestRead)
+            turnOver(wanted);
         // Bytes behind _end have never been handed out, so that they may be written in a chunk that others
         // hold.
         const Result<std::size_t> got = _source->read(std::span(*_chunk).subspan(_end));

@@ -17,11 +17,13 @@ namespace velmora {
 ///
 /// The bytes lie in chunks. `part` gives a window on the chunk itself: it stays good after the input has
 /// moved on, but keeps its whole chunk in memory; who keeps one for long, copies it. A chunk that nobody
-/// holds a part of is used again. Chunks have the given size, but where one look-ahead asks for more: then up
-/// to about twice what it asked for. Main thread only.
+/// holds a part of is used again. Chunks have the given size, but where one look-ahead asks for more: then
+/// they grow with the bytes that come, up to about twice what it asked for. Main thread only.
 class ChunkedInput {
 public:
-    static constexpr std::size_t defaultChunkSize = std::size_t{1} << 20;
+    /// Two of them come to much less than a mebibyte, so that the second, which is made once the first has
+    /// been read through, is no growth to speak of; larger ones are not read faster.
+    static constexpr std::size_t defaultChunkSize = std::size_t{256} << 10;
 
     explicit ChunkedInput(std::unique_ptr<ByteSource> source, std::size_t chunkSize = defaultChunkSize);
 

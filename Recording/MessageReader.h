@@ -8,6 +8,7 @@
 #include <cstdint>
 #include <optional>
 #include <string>
+#include <string_view>
 #include <utility>
 #include <vector>
 
@@ -22,6 +23,10 @@ struct LoggedMessage {
     Data message;             ///< exactly as it arrived at the port; may be a window on a larger buffer
     std::uint64_t number = 0; ///< its place among the file's records, from 1, records that were lost included
     std::uint64_t offset = 0; ///< where in the file its record begins, in bytes
+    /// The refresh that came after this message and before the next, where the file tells (a snapshot keeps
+    /// what each refresh had). In a file that tells, these are all refreshes there were, whatever the
+    /// messages' times.
+    std::optional<Time> refresh = std::nullopt;
 };
 
 /// Something in the file that gave no message though it should have.
@@ -54,6 +59,8 @@ public:
     [[nodiscard]] virtual std::optional<LoggedMessage> next() = 0;
     /// The short name of the technology whose messages these are ("Ostrel_GSM"); empty while it is unknown.
     [[nodiscard]] virtual const std::string& technology() const = 0;
+    /// What the file is, as people call it: "recording", "snapshot", "DLF log".
+    [[nodiscard]] virtual std::string_view form() const { return "recording"; }
     /// The read error that ended the stream early; absent when it ended with the file.
     [[nodiscard]] virtual const std::optional<Failure>& failure() const = 0;
 

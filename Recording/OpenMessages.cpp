@@ -1,21 +1,65 @@
 #include "Recording/OpenMessages.h"
 
+#include "Recording/DLFReader.h"
 #include "Recording/FileSource.h"
 #include "Recording/RecordingReader.h"
+#include "Recording/SnapshotReader.h"
 
+#include <algorithm>
+#include <string_view>
 #include <utility>
 
 namespace velmora {
+
+namespace {
+
+bool startsWith(Bytes bytes, std::string_view text) {
+    return bytes.size() >= text.size() &&
+           std::equal(text.begin(), text.end(), bytes.begin(),
+                      [](char c, std::uint8_t byte) { return static_cast<std::uint8_t>(c) == byte; });
+}
+
+/// What a property list begins with: its binary form's mark, or the first words of an XML document.
+bool isPropertyList(Bytes begin) {
+    if (startsWith(begin, "\xEF\xBB\xBF"))
+        begin = begin.subspan(3);
+    constexpr std::string_view white = " \t\r\n";
+    while (!begin.empty() && white.find(static_cast<char>(begin[0])) != white.npos)
+        begin = begin.subspan(1);
+    for (const std::string_view mark : {"bplist", "<?xml", "<!--", "<!DOCTYPE", "<plist", "<dict"}) {
+        if (startsWith(begin, mark))
+            return true;
+    }
+    return false;
+}
+
+template <class Reader>
+Result<std::unique_ptr<MessageReader>> generalized(Result<std::unique_ptr<Reader>> reader) {
+    if (!reader)
+        return Failure{reader.reason()};
+    return std::unique_ptr<MessageReader>(*std::move(reader));
+}
+
+} // namespace
 
 Result<std::unique_ptr<MessageReader>> openMessages(const std::string& path) {
     Result<std::unique_ptr<ByteSource>> source = FileSource::open(path);
     if (!source)
         return Failure{source.reason()};
-    Result<std::unique_ptr<RecordingReader>> recording =
-        RecordingReader::open(ChunkedInput(*std::move(source)));
-    if (!recording)
-        return Failure{recording.reason()};
-    return std::unique_ptr<MessageReader>(*std::move(recording));
+    return openMessages(ChunkedInput(*std::move(source)));
+}
+
+Result<std::unique_ptr<MessageReader>> openMessages(ChunkedInput input) {
+    // As much as it takes to tell and no more: on a pipe that may be all there is for a while.
+    constexpr std::string_view sectionHeader = "\n\r\r\n";
+    static_cast<void>(input.ensure(sectionHeader.size()));
+    if (startsWith(input.available(), sectionHeader))
+        return generalized(RecordingReader::open(std::move(input)));
+    constexpr std::size_t longestWhiteSpace = 256;
+    static_cast<void>(input.ensure(longestWhiteSpace));
+    if (isPropertyList(input.available()))
+        return generalized(SnapshotReader::open(std::move(input)));
+    return generalized(DLFReader::open(std::move(input), "a recording, a snapshot or a DLF log"));
 }
 
 } // namespace velmora

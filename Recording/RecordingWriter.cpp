@@ -1,8 +1,8 @@
 #include "Recording/RecordingWriter.h"
 
 #include "Platform/TelephonyService.h"
+#include "Recording/DescriptorFile.h"
 #include "Recording/MessageReader.h"
-#include "Recording/Pcapng.h"
 
 #include <algorithm>
 #include <cerrno>
@@ -10,28 +10,18 @@
 #include <utility>
 
 #include <fcntl.h>
-#include <poll.h>
 #include <unistd.h>
 
 namespace velmora {
 
 namespace {
 
-namespace BlockType = pcapng::BlockType;
-namespace Option = pcapng::Option;
-
 constexpr std::size_t flushThreshold = std::size_t{64} << 10;
 constexpr std::size_t maximumTechnology = 255;
-constexpr std::size_t packetOverhead = 32;
-constexpr std::uint8_t nanosecondResolution = 9;
-constexpr std::string_view application = VELMORA_RECORDING_APPLICATION;
 
-Bytes bytesOf(std::string_view text) {
-    return {reinterpret_cast<const std::uint8_t*>(text.data()), text.size()};
-}
-
-std::size_t optionSize(std::size_t length) {
-    return 4 + pcapng::padded(length);
+bool mayPass(int error) {
+    constexpr int passing[] = {ENOSPC, EDQUOT, EFBIG, EIO, EROFS};
+    return std::find(std::begin(passing), std::end(passing), error) != std::end(passing);
 }
 
 } // namespace
@@ -39,9 +29,7 @@ std::size_t optionSize(std::size_t length) {
 Result<std::unique_ptr<RecordingWriter>> RecordingWriter::create(const std::string& path,
                                                                  std::string_view technology) {
     if (path == "-")
-        return start(
-            std::unique_ptr<RecordingWriter>(new RecordingWriter(STDOUT_FILENO, false, "standard output")),
-            technology);
+        return start(std::make_unique<DescriptorFile>(STDOUT_FILENO, false), "standard output", technology);
     const int descriptor = ::open(path.c_str(), O_WRONLY | O_CREAT | O_TRUNC | O_CLOEXEC, 0666);
     if (descriptor < 0)
         return Failure{"cannot create " + path + ": " + std::generic_category().message(errno)};
@@ -50,24 +38,24 @@ Result<std::unique_ptr<RecordingWriter>> RecordingWriter::create(const std::stri
 
 Result<std::unique_ptr<RecordingWriter>> RecordingWriter::adopt(int descriptor, std::string name,
                                                                 std::string_view technology) {
-    return start(std::unique_ptr<RecordingWriter>(new RecordingWriter(descriptor, true, std::move(name))),
-                 technology);
+    return start(std::make_unique<DescriptorFile>(descriptor, true), std::move(name), technology);
 }
 
-Result<std::unique_ptr<RecordingWriter>> RecordingWriter::start(std::unique_ptr<RecordingWriter> writer,
-                                                                std::string_view technology) {
-    const std::string_view name = shortTechnologyName(technology);
-    if (name.size() > maximumTechnology)
-        return Failure{"technology name of " + std::to_string(name.size()) + " bytes, wanted at most " +
+Result<std::unique_ptr<RecordingWriter>>
+RecordingWriter::start(std::unique_ptr<RecordingFile> file, std::string name, std::string_view technology) {
+    std::unique_ptr<RecordingWriter> writer(new RecordingWriter(std::move(file), std::move(name)));
+    const std::string_view shortName = shortTechnologyName(technology);
+    if (shortName.size() > maximumTechnology)
+        return Failure{"technology name of " + std::to_string(shortName.size()) + " bytes, wanted at most " +
                        std::to_string(maximumTechnology)};
-    writer->putHead(name);
-    if (const Result<Done> written = writer->flush(); !written)
+    recordingBlocks::appendHead(writer->_buffer, shortName);
+    if (const Result<Done> written = writer->flush(); !written && !writer->isWaiting())
         return Failure{written.reason()};
     return writer;
 }
 
-RecordingWriter::RecordingWriter(int descriptor, bool owned, std::string name)
-    : _descriptor(descriptor), _owned(owned), _name(std::move(name)) {
+RecordingWriter::RecordingWriter(std::unique_ptr<RecordingFile> file, std::string name)
+    : _file(std::move(file)), _name(std::move(name)) {
     _buffer.reserve(2 * flushThreshold);
 }
 
@@ -82,116 +70,137 @@ Result<Done> RecordingWriter::append(Time time, Bytes message) {
     if (message.size() > maximumMessageSize)
         return Failure{"message of " + std::to_string(message.size()) + " bytes, wanted at most " +
                        std::to_string(maximumMessageSize)};
-    const auto stamp = static_cast<std::uint64_t>(std::max<std::int64_t>(time.time_since_epoch().count(), 0));
-    const auto size = static_cast<std::uint32_t>(message.size());
-    const auto length = static_cast<std::uint32_t>(packetOverhead + pcapng::padded(message.size()));
+    const std::size_t length = recordingBlocks::packetSize(message.size());
     // What has been gathered goes out ahead of a long message, so that the buffer need not hold both.
-    if (!_buffer.empty() && _buffer.size() + length > 2 * flushThreshold) {
-        if (Result<Done> written = flush(); !written)
+    if (!_trouble && !waiting().empty() && waiting().size() + length > 2 * flushThreshold) {
+        if (Result<Done> written = flush(); !written && !_trouble)
             return written;
     }
-    put32(BlockType::EnhancedPacket);
-    put32(length);
-    put32(0); // the interface
-    put32(static_cast<std::uint32_t>(stamp >> 32));
-    put32(static_cast<std::uint32_t>(stamp));
-    put32(size);
-    put32(size);
-    putPadded(message);
-    put32(length);
+    _dropping = _dropping || (_trouble && waiting().size() + length > maximumQueue);
+    if (_dropping) {
+        ++_dropped;
+        return *_trouble;
+    }
+    recordingBlocks::appendPacket(_buffer, time, message);
     ++_messages;
-    return _buffer.size() < flushThreshold ? Done{} : flush();
+    return _trouble || waiting().size() < flushThreshold ? outcome() : flush();
 }
 
 Result<Done> RecordingWriter::flush() {
-    Bytes rest = _buffer;
-    while (!rest.empty() && !_failure) {
-        const ssize_t count = ::write(_descriptor, rest.data(), rest.size());
-        if (count >= 0) {
-            rest = rest.subspan(static_cast<std::size_t>(count));
-        } else if (errno == EAGAIN || errno == EWOULDBLOCK) {
-            pollfd writable{_descriptor, POLLOUT, 0};
-            ::poll(&writable, 1, -1);
-        } else if (errno != EINTR) {
-            _failure = fail("write", errno);
-        }
-    }
-    _buffer.clear();
     if (_failure)
         return *_failure;
+    // What trouble has left behind the last whole block goes first.
+    if (const int error = _trouble ? _file->cutTo(_end) : 0; error != 0) {
+        stumble("write", error);
+        return outcome();
+    }
+    for (Bytes rest = waiting(); !rest.empty();) {
+        const RecordingFile::Written written = _file->write(rest);
+        if (written.error != 0) {
+            stumble("write", written.error);
+            return outcome();
+        }
+        _end += written.bytes;
+        rest = rest.subspan(written.bytes);
+    }
+    _trouble.reset();
+    _dropping = false;
+    if (!_keeps || written() > maximumKept)
+        forget(written());
+    return Done{};
+}
+
+Result<Done> RecordingWriter::sync() {
+    _keeps = _file->isRegular();
+    // A medium that failed is tried again by the next call, so that this one tells of it.
+    if (!takeSyncOutcome())
+        return outcome();
+    if (Result<Done> flushed = flush(); !flushed)
+        return flushed;
+    if (_keeps && !_syncIsUnderWay && _synced < _end) {
+        _file->startSync();
+        _syncIsUnderWay = true;
+        _syncing = _end;
+    }
     return Done{};
 }
 
 Result<Done> RecordingWriter::close() {
-    if (_descriptor >= 0) {
-        const Result<Done> written = flush();
-        // Pipes and terminals have nothing to put anywhere, and say EINVAL or the like.
-        if (written && ::fsync(_descriptor) != 0 && (errno == EIO || errno == ENOSPC || errno == EDQUOT))
-            _failure = fail("write", errno);
-        const int descriptor = std::exchange(_descriptor, -1);
-        if (_owned && ::close(descriptor) != 0 && errno != EINTR && !_failure)
-            _failure = fail("close", errno);
-    }
+    if (!_file)
+        return outcome();
+    Result<Done> flushed = flush();
+    // Where all that the medium refused has been kept, it gets a second try.
+    if (flushed && _file->isRegular() && !settle() && _base == _synced && (flushed = flush()))
+        static_cast<void>(settle());
+    if (const int error = _file->close(); error != 0 && outcome())
+        _failure = failureOf("close", error);
+    _file.reset();
+    return outcome();
+}
+
+recordingBlocks::PacketCount RecordingWriter::unsaved() const {
+    return recordingBlocks::countPackets(waiting());
+}
+
+Result<Done> RecordingWriter::outcome() const {
     if (_failure)
         return *_failure;
+    if (_trouble)
+        return *_trouble;
     return Done{};
 }
 
-void RecordingWriter::putHead(std::string_view technology) {
-    const auto sectionLength =
-        static_cast<std::uint32_t>(24 + optionSize(application.size()) + optionSize(0) + 4);
-    put32(BlockType::SectionHeader);
-    put32(sectionLength);
-    put32(pcapng::byteOrderMagic);
-    put16(1); // format version 1.0
-    put16(0);
-    put32(0xFFFFFFFF); // the section's length is not known beforehand
-    put32(0xFFFFFFFF);
-    putOption(Option::SectionUserApplication, application);
-    putOption(Option::End, std::string_view());
-    put32(sectionLength);
-
-    const auto interfaceLength =
-        static_cast<std::uint32_t>(16 + optionSize(technology.size()) + optionSize(1) + optionSize(0) + 4);
-    put32(BlockType::InterfaceDescription);
-    put32(interfaceLength);
-    put16(pcapng::logMessageLinkType);
-    put16(0);
-    put32(0); // messages of any length
-    putOption(Option::InterfaceName, technology);
-    putOption(Option::TimeResolution, Bytes(&nanosecondResolution, 1));
-    putOption(Option::End, std::string_view());
-    put32(interfaceLength);
+bool RecordingWriter::takeSyncOutcome() {
+    const std::optional<int> error = _syncIsUnderWay ? _file->takeSyncOutcome() : std::nullopt;
+    if (!error)
+        return true;
+    _syncIsUnderWay = false;
+    return takeMediumsWord(*error, _syncing);
 }
 
-void RecordingWriter::put16(std::uint16_t value) {
-    _buffer.push_back(static_cast<std::uint8_t>(value));
-    _buffer.push_back(static_cast<std::uint8_t>(value >> 8));
+bool RecordingWriter::settle() {
+    _syncIsUnderWay = false;
+    return takeMediumsWord(_file->sync(), _end);
 }
 
-void RecordingWriter::put32(std::uint32_t value) {
-    put16(static_cast<std::uint16_t>(value));
-    put16(static_cast<std::uint16_t>(value >> 16));
+bool RecordingWriter::takeMediumsWord(int error, std::uint64_t end) {
+    // Some file systems have nothing to put anywhere, and say so.
+    if (mayPass(error)) {
+        // What is not known to be on the medium is written once more.
+        _end = _base;
+        stumble("write", error);
+        return false;
+    }
+    _synced = end;
+    if (end > _base)
+        forget(static_cast<std::size_t>(end - _base));
+    return true;
 }
 
-void RecordingWriter::putPadded(Bytes bytes) {
-    _buffer.insert(_buffer.end(), bytes.begin(), bytes.end());
-    _buffer.resize(_buffer.size() + pcapng::padded(bytes.size()) - bytes.size());
+void RecordingWriter::stumble(const char* operation, int error) {
+    _end = _base + recordingBlocks::wholeBlocks(_buffer, written());
+    const bool passing = mayPass(error) && _file->isRegular();
+    const int cutError = passing ? _file->cutTo(_end) : 0;
+    if (passing && (cutError == 0 || mayPass(cutError))) {
+        _trouble = failureOf(operation, error);
+        return;
+    }
+    _trouble.reset();
+    _failure = failureOf(operation, error);
 }
 
-void RecordingWriter::putOption(std::uint16_t code, Bytes value) {
-    put16(code);
-    put16(static_cast<std::uint16_t>(value.size()));
-    putPadded(value);
-}
-
-void RecordingWriter::putOption(std::uint16_t code, std::string_view text) {
-    putOption(code, bytesOf(text));
-}
-
-Failure RecordingWriter::fail(const char* operation, int error) {
-    return Failure{"cannot " + std::string(operation) + " " + _name + ": " +
+Failure RecordingWriter::failureOf(const char* operation, int error) const {
+    return Failure{std::string("cannot ") + operation + " " + _name + ": " +
                    std::generic_category().message(error)};
+}
+
+void RecordingWriter::forget(std::size_t length) {
+    _buffer.erase(_buffer.begin(), _buffer.begin() + static_cast<std::ptrdiff_t>(length));
+    _base += length;
+    if (_buffer.empty() && _buffer.capacity() > maximumKept) { // a long queue's room
+        _buffer.shrink_to_fit();
+        _buffer.reserve(2 * flushThreshold);
+    }
 }
 
 } // namespace velmora

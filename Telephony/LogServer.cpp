@@ -57,6 +57,7 @@ Result<Done> LogServer::listen(std::function<void()> whenLost) {
         lost();
     });
     _serverPort->attachToMainQueue();
+    _source.whenTechnologyChanges([this] { technologyChanged(); });
     return Done{};
 }
 
@@ -64,6 +65,7 @@ void LogServer::stop() {
     if (const auto port = std::exchange(_serverPort, nullptr)) {
         port->setInvalidationCallback(nullptr);
         port->invalidate();
+        _source.whenTechnologyChanges(nullptr);
     }
     for (const ChannelRef& channel : _channels)
         if (channel->isOpen())
@@ -98,7 +100,7 @@ Value LogServer::createChannel(const Data& request) {
     // of the same owner's, who would now get everything twice.
     for (const ChannelRef& channel : _channels)
         if (channel->applicationName() == *name)
-            close(*channel);
+            close(*channel, *name + " has gone");
     std::shared_ptr<LocalPort> commands = createChannelPort();
     if (!commands) {
         logFormat(LogPriority::Error, "%s wants a log channel, but no port can be made for it",
@@ -110,11 +112,11 @@ Value LogServer::createChannel(const Data& request) {
     const std::weak_ptr<LogChannel> weak = channel;
     application->setInvalidationCallback([this, weak](RemotePort&) {
         if (const auto gone = weak.lock())
-            close(*gone);
+            close(*gone, gone->applicationName() + " has gone");
     });
     commands->setInvalidationCallback([this, weak](LocalPort&) {
         if (const auto gone = weak.lock())
-            close(*gone);
+            close(*gone, gone->applicationName() + " has gone");
     });
     commands->attachToMainQueue();
     logFormat(LogPriority::Notice, "%s: opened for %s", channel->name().c_str(), name->c_str());
@@ -136,11 +138,17 @@ std::shared_ptr<LocalPort> LogServer::createChannelPort() {
     return nullptr;
 }
 
-void LogServer::close(LogChannel& channel) {
+void LogServer::technologyChanged() {
+    const std::string why =
+        "the technology is " + std::string(shortTechnologyName(_source.technology())) + " now";
+    for (const ChannelRef& channel : _channels)
+        close(*channel, why);
+}
+
+void LogServer::close(LogChannel& channel, const std::string& why) {
     if (!channel.isOpen())
         return;
-    logFormat(LogPriority::Notice, "%s: closed, %s has gone", channel.name().c_str(),
-              channel.applicationName().c_str());
+    logFormat(LogPriority::Notice, "%s: closed, %s", channel.name().c_str(), why.c_str());
     channel.close();
     // Not at once: messages may be on their way to the channels just now.
     _queue.async([this, weak = std::weak_ptr<bool>(_alive)] {
@@ -174,8 +182,11 @@ std::optional<Data> LogServer::command(const std::string& channelName, const Dat
         return std::nullopt;
     }
     const Dictionary* dictionary = parsed->asDictionary();
-    if (dictionary && dictionary->contains(vox::getTechnologyKey))
+    if (dictionary && dictionary->contains(vox::getTechnologyKey)) {
+        if (_source.technology().empty())
+            return serialized(Value(makeDictionary())); // the client asks again later
         return serialized(replyOf(vox::getTechnologyKey, _source.technology()));
+    }
     if (dictionary && dictionary->contains(vox::setStateKey)) {
         startStreaming(*channel, *dictionary);
         return std::nullopt;

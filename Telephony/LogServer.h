@@ -22,7 +22,9 @@ namespace velmora {
 /// when the last one has gone, so that a lone client always sees the stream from its beginning. A client that
 /// joins later first gets the latest message of each code of the extra stream again, since those describe a
 /// state. A channel closes when the connection to its client's port ends, or when a new one is made for the
-/// same port. Commands that make no sense give an error line and change nothing. Main thread only.
+/// same port. When the source's technology changes all channels close, so that their clients connect again
+/// and ask for it anew; while the source does not know its technology, GetTechnology is answered without one.
+/// Commands that make no sense give an error line and change nothing. Main thread only.
 class LogServer final : private LogSink {
 public:
     /// What a request for a channel is refused with.
@@ -59,8 +61,10 @@ private:
 
     [[nodiscard]] Value createChannel(const Data& request);
     [[nodiscard]] std::shared_ptr<LocalPort> createChannelPort();
+    /// `why` stands in the log.
+    void close(LogChannel& channel, const std::string& why);
+    void technologyChanged();
     /// Empties `_channels` of those that are closed and stops the source after the last.
-    void close(LogChannel& channel);
     void sweep();
     [[nodiscard]] std::optional<Data> command(const std::string& channelName, const Data& payload);
     void startStreaming(LogChannel& channel, const Dictionary& command);

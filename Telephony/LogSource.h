@@ -2,6 +2,7 @@
 
 #include "Platform/Bytes.h"
 
+#include <functional>
 #include <string_view>
 
 namespace velmora {
@@ -17,13 +18,17 @@ public:
     [[nodiscard]] virtual bool hasRoom() const = 0;
 };
 
-/// Something that speaks as a modem does: a synthetic drive, a recording. Runs on the main queue; in one
-/// wake-up it sends a bounded number of messages. Main thread only.
+/// Something that speaks as a modem does: a synthetic drive, a recording, a modem. Runs on the main queue; in
+/// one wake-up it sends a bounded number of messages. Main thread only.
 class LogSource {
 public:
     virtual ~LogSource() = default;
-    /// The constant of the log technology that the source speaks.
+    /// The constant of the log technology that the source speaks; empty while it does not know yet.
     [[nodiscard]] virtual std::string_view technology() const = 0;
+    /// `changed` is called whenever the technology has become another one, started or not; an empty function
+    /// takes it back. What is sent from then on is of the new technology. A source that speaks one technology
+    /// for all its life need not override it.
+    virtual void whenTechnologyChanges(std::function<void()> changed) { static_cast<void>(changed); }
     /// Begins to send from the very beginning, never from inside this call. Precondition: not started. The
     /// sink must live until `stop`.
     virtual void start(LogSink& sink) = 0;

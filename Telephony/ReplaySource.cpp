@@ -24,9 +24,11 @@ Result<std::unique_ptr<ReplaySource>> ReplaySource::create(MainQueue& queue, con
         static_cast<void>((*reader)->next());
     if ((*reader)->failure())
         return Failure{name + ": " + (*reader)->failure()->reason};
-    if ((*reader)->technology().empty())
-        return Failure{name + ": the file does not say which technology its messages are of"};
-    std::string technology = technologyConstant((*reader)->technology());
+    const std::string& told = options.technology.empty() ? (*reader)->technology() : options.technology;
+    if (told.empty())
+        return Failure{name + ": the file does not say which technology its messages are of; technology=NAME "
+                              "supplies it"};
+    std::string technology = technologyConstant(told);
     return std::unique_ptr<ReplaySource>(
         new ReplaySource(queue, clock, std::move(name), std::move(technology), std::move(open), options));
 }

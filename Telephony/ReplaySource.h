@@ -22,12 +22,14 @@ public:
     using Open = std::function<Result<std::unique_ptr<MessageReader>>()>;
 
     struct Options {
-        double speed = 1;  ///< 0: as fast as the clients take it
-        bool loop = false; ///< at the end begin again, a second later
+        double speed = 1;            ///< 0: as fast as the clients take it
+        bool loop = false;           ///< at the end begin again, a second later
+        std::string technology = {}; ///< goes before the one that the file tells; empty for that one
     };
 
     /// Opens the file (`open` does; `name` is what messages call it) to learn its technology. Fails for one
-    /// that cannot be read or that does not say which technology it is of. Queue and clock must outlive it.
+    /// that cannot be read or, unless the options name it, does not tell which technology it is of. Queue and
+    /// clock must outlive it.
     static Result<std::unique_ptr<ReplaySource>> create(MainQueue& queue, const Clock& clock,
                                                         std::string name, Open open, Options options);
 

@@ -1,6 +1,8 @@
 #include "Telephony/SourceFactory.h"
 
+#include "Platform/TelephonyService.h"
 #include "Recording/OpenMessages.h"
+#include "Telephony/ModemManager/ModemManagerSource.h"
 #include "Telephony/ReplaySource.h"
 #include "Telephony/ScenarioRegistry.h"
 #include "Telephony/ScenarioSource.h"
@@ -23,11 +25,16 @@ Made make(const ScenarioChoice& choice, MainQueue& queue, const Clock& clock) {
 
 Made make(const ReplayChoice& choice, MainQueue& queue, const Clock& clock) {
     auto open = [file = choice.file] { return openMessages(file); };
-    auto source =
-        ReplaySource::create(queue, clock, choice.file, std::move(open), {choice.speed, choice.loop});
+    auto source = ReplaySource::create(queue, clock, choice.file, std::move(open),
+                                       {choice.speed, choice.loop, choice.technology});
     if (!source)
         return Failure{source.reason()};
     return std::unique_ptr<LogSource>(*std::move(source));
+}
+
+Made make(const ModemManagerChoice& choice, MainQueue& queue, const Clock& clock) {
+    return std::unique_ptr<LogSource>(
+        std::make_unique<ModemManagerSource>(queue, clock, ModemFollower::Options{choice.modem, {}}));
 }
 
 } // namespace
@@ -44,12 +51,16 @@ std::string sourceHelp(std::string_view program) {
                        " speed 1 is its own pace\n";
     for (const ScenarioKind& kind : scenarioKinds())
         help += "    " + std::string(kind.name) + ": " + std::string(kind.description) + "\n";
-    help +=
-        "  replay:FILE[,speed=X][,loop]      a file of log messages at its own pace; speed max is as fast as"
-        " clients take it\n\n"
-        "Examples:\n";
+    help += "  replay:FILE[,speed=X][,loop][,technology=NAME]\n"
+            "    a recording, snapshot or DLF log at its own pace; speed max is as fast as clients take it;"
+            " technology, where the file does not tell its own, is one of ";
+    help += technologyNames() + "\n";
+    help += "  modemmanager[,modem=INDEX]\n"
+            "    the modem that ModemManager looks after, live; without INDEX the first that has a SIM\n\n";
+    help += "Examples:\n";
     help += call + "scenario:gsm,seed=7,speed=2\n";
-    help += call + "replay:drive.pcapng,speed=max,loop";
+    help += call + "replay:drive.pcapng,speed=max,loop\n";
+    help += call + "modemmanager";
     return help;
 }
 

@@ -1,5 +1,6 @@
 #include "Telephony/SourceString.h"
 
+#include "Platform/TelephonyService.h"
 #include "Telephony/ScenarioRegistry.h"
 
 #include <charconv>
@@ -12,6 +13,8 @@ namespace {
 constexpr std::string_view seedKey = "seed=";
 constexpr std::string_view speedKey = "speed=";
 constexpr std::string_view loopKey = "loop";
+constexpr std::string_view modemKey = "modem=";
+constexpr std::string_view technologyKey = "technology=";
 
 std::string quoted(std::string_view text) {
     return '"' + std::string(text) + '"';
@@ -85,6 +88,13 @@ Result<SourceChoice> parseReplay(std::string_view text) {
             const auto taken = takeSpeed(option.substr(speedKey.size()), true, speed);
             if (!taken)
                 return Failure{taken.reason()};
+        } else if (option.starts_with(technologyKey)) {
+            if (!choice.technology.empty())
+                return Failure{"technology is given twice, wanted once"};
+            const std::string_view name = option.substr(technologyKey.size());
+            if (!isTechnology(name))
+                return Failure{"technology is " + quoted(name) + ", wanted one of: " + technologyNames()};
+            choice.technology = shortTechnologyName(name);
         } else {
             break;
         }
@@ -98,17 +108,38 @@ Result<SourceChoice> parseReplay(std::string_view text) {
     return SourceChoice(choice);
 }
 
+/// `text` is what follows the source's name: nothing, or a comma and options.
+Result<SourceChoice> parseModemManager(std::string_view text) {
+    ModemManagerChoice choice;
+    while (!text.empty()) {
+        text.remove_prefix(1);
+        const std::string_view option = text.substr(0, text.find(','));
+        text.remove_prefix(option.size());
+        if (!option.starts_with(modemKey))
+            return Failure{"option is " + quoted(option) + ", wanted modem=INDEX"};
+        if (choice.modem)
+            return Failure{"modem is given twice, wanted once"};
+        const std::string_view number = option.substr(modemKey.size());
+        choice.modem = numberOf<std::uint32_t>(number);
+        if (!choice.modem)
+            return Failure{"modem is " + quoted(number) + ", wanted the number at the end of its path"};
+    }
+    return SourceChoice(choice);
+}
+
 } // namespace
 
 Result<SourceChoice> parseSource(std::string_view text) {
     constexpr std::string_view scenario = "scenario:";
     constexpr std::string_view replay = "replay:";
+    constexpr std::string_view modemManager = "modemmanager";
     if (text.starts_with(scenario))
         return parseScenario(text.substr(scenario.size()));
     if (text.starts_with(replay))
         return parseReplay(text.substr(replay.size()));
-    return Failure{"source is " + quoted(text) +
-                   ", wanted scenario:NAME[,seed=N][,speed=X] or replay:FILE[,speed=X][,loop]"};
+    if (text == modemManager || text.starts_with(std::string(modemManager) + ','))
+        return parseModemManager(text.substr(modemManager.size()));
+    return Failure{"source is " + quoted(text) + ", wanted " + std::string(sourceForms)};
 }
 
 } // namespace velmora

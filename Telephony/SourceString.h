@@ -3,6 +3,7 @@
 #include "Platform/Result.h"
 
 #include <cstdint>
+#include <optional>
 #include <string>
 #include <string_view>
 #include <variant>
@@ -16,18 +17,29 @@ struct ScenarioChoice {
     double speed = 1; ///< above 0
 };
 
-/// "replay:FILE[,speed=X][,loop]"
+/// "replay:FILE[,speed=X][,loop][,technology=NAME]"
 struct ReplayChoice {
     std::string file;
     double speed = 1; ///< 0: as fast as the clients take it
     bool loop = false;
+    std::string technology = {}; ///< before the one that the file tells; a short name, empty for the file's
 };
 
-using SourceChoice = std::variant<ScenarioChoice, ReplayChoice>;
+/// "modemmanager[,modem=INDEX]"
+struct ModemManagerChoice {
+    std::optional<std::uint32_t> modem; ///< its index; any modem where there is none
+};
+
+using SourceChoice = std::variant<ScenarioChoice, ReplayChoice, ModemManagerChoice>;
+
+/// The forms of a source, as help and messages show them.
+inline constexpr std::string_view sourceForms =
+    "scenario:NAME[,seed=N][,speed=X], replay:FILE[,speed=X][,loop][,technology=NAME] or "
+    "modemmanager[,modem=INDEX]";
 
 /// Reads what the command line says of the source. Options may come in any order, each once. A file's name
-/// may hold commas: what follows its last one that is no option ("loop", "speed=...") belongs to the name.
-/// The reason gives what was found and what was wanted.
+/// may hold commas: what follows its last one that is no option ("loop", "speed=...", "technology=...")
+/// belongs to the name. The reason gives what was found and what was wanted.
 Result<SourceChoice> parseSource(std::string_view text);
 
 } // namespace velmora

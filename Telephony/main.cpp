@@ -3,7 +3,9 @@
 #include "Platform/Linux/MainLoop.h"
 #include "Platform/Linux/ProgramLog.h"
 #include "Platform/Linux/QtMainQueue.h"
+#include "Platform/Linux/ServiceManager.h"
 #include "Platform/Linux/SignalWatcher.h"
+#include "Platform/Linux/Termination.h"
 #include "Platform/SystemLog.h"
 #include "Telephony/LogServer.h"
 #include "Telephony/SourceFactory.h"
@@ -32,10 +34,10 @@ struct Options {
 void declare(CLI::App& app, Options& options) {
     app.description("The telephony service of Velmora: gives its clients the log messages of a source.");
     app.set_version_flag("--version", std::string(program) + " " VELMORA_VERSION);
-    app.add_option(
-           "--source", options.source,
-           "Where the messages come from: scenario:NAME[,seed=N][,speed=X] or replay:FILE[,speed=X][,loop]")
+    app.add_option("--source", options.source,
+                   "Where the messages come from: " + std::string(velmora::sourceForms))
         ->required()
+        ->envname("VELMORA_SOURCE")
         ->type_name("SOURCE");
     app.add_option_function<std::string>(
            "--log", [&options](const std::string& name) { options.log = *velmora::logKindNamed(name); },
@@ -58,6 +60,7 @@ int serve(const Options& options, const velmora::SourceChoice& choice) {
     QtMainQueue queue;
     const MachineClock clock;
     LinuxMessagePorts ports;
+    const ServiceManager manager;
 
     const auto source = makeSource(choice, queue, clock);
     if (!source) {
@@ -74,8 +77,11 @@ int serve(const Options& options, const velmora::SourceChoice& choice) {
         logFormat(LogPriority::Notice, "stopping on signal %d", number);
         loop.quit(done);
     });
-    logFormat(LogPriority::Notice, "serving %s", options.source.c_str());
+    const std::string serving = std::string("serving ").append(options.source);
+    logLine(LogPriority::Notice, serving);
+    manager.ready(serving);
     const int status = loop.run();
+    manager.stopping();
     server.stop();
     return status;
 }
@@ -83,6 +89,7 @@ int serve(const Options& options, const velmora::SourceChoice& choice) {
 } // namespace
 
 int main(int argc, char** argv) {
+    velmora::endOnUncaughtExceptions(program);
     Options options;
     CLI::App app;
     declare(app, options);

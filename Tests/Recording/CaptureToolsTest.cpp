@@ -1,12 +1,10 @@
 #include "Recording/RecordingReader.h"
 #include "Recording/RecordingWriter.h"
 #include "Tests/Recording/PcapngFile.h"
+#include "Tests/Support/ShellCommand.h"
 #include "Tests/Support/TemporaryDirectory.h"
 
-#include <array>
 #include <chrono>
-#include <cstdio>
-#include <cstdlib>
 #include <string>
 #include <vector>
 
@@ -19,28 +17,6 @@ namespace {
 using testing::ElementsAre;
 using testing::HasSubstr;
 using testing::IsEmpty;
-
-struct Outcome {
-    int status = -1;
-    std::string text;
-};
-
-/// Runs a shell command; its standard output, without what it says besides.
-Outcome run(const std::string& command) {
-    Outcome outcome;
-    std::FILE* const pipe = ::popen((command + " 2>/dev/null").c_str(), "r");
-    if (pipe == nullptr)
-        return outcome;
-    std::array<char, 4096> buffer{};
-    while (const std::size_t count = std::fread(buffer.data(), 1, buffer.size(), pipe))
-        outcome.text.append(buffer.data(), count);
-    outcome.status = ::pclose(pipe);
-    return outcome;
-}
-
-#define NEEDS(program)                                                                                       \
-    if (run("command -v " program).status != 0)                                                              \
-    GTEST_SKIP() << program << " is not installed"
 
 /// The field's capture tools on what we write, and we on what they write.
 class CaptureTools : public testing::Test {
@@ -79,53 +55,56 @@ protected:
 };
 
 TEST_F(CaptureTools, showWhatARecordingIs) {
-    NEEDS("capinfos");
+    NEEDS_PROGRAM("capinfos");
     const std::string path = record("a.pcapng", "Ostrel_GSM", 1'794'805'200'123'456'789, {"0102", "", "03"});
-    const Outcome outcome = run("capinfos " + path);
+    const ShellOutcome outcome = runShell("capinfos " + path);
     EXPECT_EQ(outcome.status, 0);
-    EXPECT_THAT(outcome.text, HasSubstr("File encapsulation:  USER 0"));
-    EXPECT_THAT(outcome.text, HasSubstr("Number of packets:   3"));
-    EXPECT_THAT(outcome.text, HasSubstr("File timestamp precision:  nanoseconds (9)"));
-    EXPECT_THAT(outcome.text, HasSubstr("Capture application: Velmora " VELMORA_TEST_VERSION));
-    EXPECT_THAT(outcome.text, HasSubstr("Number of interfaces in file: 1"));
-    EXPECT_THAT(outcome.text, HasSubstr("Name = Ostrel_GSM"));
-    EXPECT_THAT(outcome.text, HasSubstr("Encapsulation = USER 0"));
+    EXPECT_THAT(outcome.output, HasSubstr("File encapsulation:  USER 0"));
+    EXPECT_THAT(outcome.output, HasSubstr("Number of packets:   3"));
+    EXPECT_THAT(outcome.output, HasSubstr("File timestamp precision:  nanoseconds (9)"));
+    EXPECT_THAT(outcome.output, HasSubstr("Capture application: Velmora " VELMORA_TEST_VERSION));
+    EXPECT_THAT(outcome.output, HasSubstr("Number of interfaces in file: 1"));
+    EXPECT_THAT(outcome.output, HasSubstr("Name = Ostrel_GSM"));
+    EXPECT_THAT(outcome.output, HasSubstr("Encapsulation = USER 0"));
 }
 
 TEST_F(CaptureTools, listTheMessages) {
-    NEEDS("tshark");
+    NEEDS_PROGRAM("tshark");
     const std::string path = record("a.pcapng", "Ostrel_GSM", 1'794'805'200'123'456'789, {"0102", "AABBCC"});
-    const Outcome outcome = run("tshark -r " + path +
-                                " -T fields -E separator=/s -e frame.number -e frame.time_epoch -e frame.len"
-                                " -e frame.cap_len -e frame.interface_name");
+    const ShellOutcome outcome =
+        runShell("tshark -r " + path +
+                 " -T fields -E separator=/s -e frame.number -e frame.time_epoch -e frame.len"
+                 " -e frame.cap_len -e frame.interface_name");
     EXPECT_EQ(outcome.status, 0);
-    EXPECT_EQ(outcome.text, "1 1794805200.123456789 2 2 Ostrel_GSM\n2 1794805201.123456789 3 3 Ostrel_GSM\n");
+    EXPECT_EQ(outcome.output,
+              "1 1794805200.123456789 2 2 Ostrel_GSM\n2 1794805201.123456789 3 3 Ostrel_GSM\n");
 }
 
 TEST_F(CaptureTools, cutARecording) {
-    NEEDS("editcap");
+    NEEDS_PROGRAM("editcap");
     const std::string path = record("a.pcapng", "Ostrel_LTE", 5, {"01", "02", "03", "04"});
     const std::string cut = _directory / "cut.pcapng";
-    ASSERT_EQ(run("editcap -r " + path + " " + cut + " 2-3").status, 0);
+    ASSERT_EQ(runShell("editcap -r " + path + " " + cut + " 2-3").status, 0);
     EXPECT_THAT(messagesOf(cut), ElementsAre("1, 1000000005 ns: 02", "2, 2000000005 ns: 03"));
     EXPECT_EQ((*RecordingReader::open(cut))->technology(), "Ostrel_LTE");
 }
 
 TEST_F(CaptureTools, shortenMessagesWhichAreThenLost) {
-    NEEDS("editcap");
+    NEEDS_PROGRAM("editcap");
     const std::string path = record("a.pcapng", "Ostrel_LTE", 5, {"01", "020202020202"});
     const std::string cut = _directory / "cut.pcapng";
-    ASSERT_EQ(run("editcap -s 4 " + path + " " + cut).status, 0);
+    ASSERT_EQ(runShell("editcap -s 4 " + path + " " + cut).status, 0);
     EXPECT_THAT(messagesOf(cut, 1), ElementsAre("1, 5 ns: 01"));
 }
 
 TEST_F(CaptureTools, mergeRecordingsByTime) {
-    NEEDS("mergecap");
+    NEEDS_PROGRAM("mergecap");
     const std::string a = record("a.pcapng", "Ostrel_LTE", 0, {"A1", "A2"});
     const std::string b = record("b.pcapng", "Ostrel_LTE", 500'000'000, {"B1", "B2"});
     const std::string merged = _directory / "merged.pcapng";
     for (const char* const mode : {"none", "all", "any"}) {
-        ASSERT_EQ(run("mergecap -I " + std::string(mode) + " -w " + merged + " " + a + " " + b).status, 0);
+        ASSERT_EQ(runShell("mergecap -I " + std::string(mode) + " -w " + merged + " " + a + " " + b).status,
+                  0);
         EXPECT_THAT(messagesOf(merged), ElementsAre("1, 0 ns: A1", "2, 500000000 ns: B1",
                                                     "3, 1000000000 ns: A2", "4, 1500000000 ns: B2"))
             << mode;
@@ -133,11 +112,11 @@ TEST_F(CaptureTools, mergeRecordingsByTime) {
 }
 
 TEST_F(CaptureTools, mergeTechnologiesOfWhichTheFirstIsRead) {
-    NEEDS("mergecap");
+    NEEDS_PROGRAM("mergecap");
     const std::string a = record("a.pcapng", "Ostrel_LTE", 0, {"A1", "A2"});
     const std::string b = record("b.pcapng", "Ostrel_GSM", 500'000'000, {"B1"});
     const std::string merged = _directory / "merged.pcapng";
-    ASSERT_EQ(run("mergecap -w " + merged + " " + a + " " + b).status, 0);
+    ASSERT_EQ(runShell("mergecap -w " + merged + " " + a + " " + b).status, 0);
     EXPECT_THAT(messagesOf(merged, 1), ElementsAre("1, 0 ns: A1", "3, 1000000000 ns: A2"));
 }
 

@@ -2,7 +2,9 @@
 
 #include "Tests/Recording/PcapngFile.h"
 
+#include <algorithm>
 #include <memory>
+#include <span>
 #include <vector>
 
 #include <gtest/gtest.h>
@@ -104,6 +106,38 @@ TEST(ChunkedInput, ofNothingHasNothing) {
     EXPECT_FALSE(input.ensure(1));
     EXPECT_TRUE(input.available().empty());
     EXPECT_FALSE(input.failure());
+}
+
+/// Memory that tells how much room it was given to read into.
+class WatchedSource final : public ByteSource {
+public:
+    WatchedSource(Data data, std::size_t& mostRoom) : _memory(std::move(data)), _mostRoom(mostRoom) {}
+    Result<std::size_t> read(std::span<std::uint8_t> buffer) override {
+        _mostRoom = std::max(_mostRoom, buffer.size());
+        return _memory.read(buffer);
+    }
+
+private:
+    MemorySource _memory;
+    std::size_t& _mostRoom;
+};
+
+TEST(ChunkedInput, takesNoMemoryForBytesThatAreOnlyPromised) {
+    std::size_t mostRoom = 0;
+    ChunkedInput input(std::make_unique<WatchedSource>(counting(25), mostRoom), smallChunk);
+    EXPECT_FALSE(input.ensure(std::size_t{16} << 20));
+    EXPECT_EQ(input.available().size(), 100U);
+    // The next power of two above two chunks at most: there are 100 bytes, whatever was asked for.
+    EXPECT_LE(mostRoom, 2 * smallChunk);
+}
+
+TEST(ChunkedInput, growsToALongLookAheadWithTheBytesThatCome) {
+    const Data content = counting(100'000);
+    ChunkedInput input(std::make_unique<MemorySource>(content, 5000), smallChunk);
+    ASSERT_TRUE(input.ensure(content.size()));
+    EXPECT_EQ(Data::copyOf(input.available()), content);
+    EXPECT_FALSE(input.ensure(content.size() + 1));
+    EXPECT_EQ(Data::copyOf(input.available()), content);
 }
 
 } // namespace

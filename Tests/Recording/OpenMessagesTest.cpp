@@ -3,6 +3,7 @@
 #include "Recording/FileSource.h"
 #include "Recording/RecordingReader.h"
 #include "Recording/RecordingWriter.h"
+#include "Tests/Recording/LogFile.h"
 #include "Tests/Recording/PcapngFile.h"
 #include "Tests/Support/TemporaryDirectory.h"
 
@@ -120,14 +121,54 @@ TEST_F(OpenMessages, waitsWherePipesDoNotBlock) {
     EXPECT_EQ((*reader)->lossTotals().losses, 0U);
 }
 
+TEST_F(OpenMessages, tellsTheFormByWhatTheFileBeginsWith) {
+    const Data list = snapshotFile({historyEntry(record(0x512C, "05000100"), "2026-11-16 05:00:02 +0000")});
+    const Data document = hex("EFBBBF 0A20"); // a mark of UTF-8, and white space
+    const auto formOf = [this](const Data& content) {
+        const auto reader = openMessages(fileOf(content));
+        return reader ? std::string((*reader)->form()) : reader.reason();
+    };
+    EXPECT_EQ(formOf(PcapngFile().head().data()), "recording");
+    EXPECT_EQ(formOf(list), "snapshot");
+    EXPECT_EQ(formOf(snapshotFile({}, true)), "snapshot");
+    EXPECT_EQ(formOf(joined(document, list.from(39))), "snapshot"); // without its first line
+    EXPECT_EQ(formOf(versionReport()), "DLF log");
+    EXPECT_EQ(formOf(joined(bareRecord(0x512C, "05000100", stampAfter(0)),
+                            bareRecord(0x512C, "04000100", stampAfter(1)))),
+              "DLF log");
+    // One record that is none of ours, without a time, is no more than a few bytes.
+    EXPECT_EQ(
+        formOf(bareRecord(0x1375, "05000100", stampAfter(0))),
+        "begins 10 00 75 13 00 00 40 32 9B 74 13 01 (hex), wanted a recording, a snapshot or a DLF log");
+}
+
+TEST_F(OpenMessages, readsEveryFormThroughAPipe) {
+    for (const Data& file :
+         {snapshotFile({historyEntry(record(0x512C, "05000100"), "2026-11-16 05:00:02 +0000")}),
+          joined(versionReport(), bareRecord(0x512C, "05000100"))}) {
+        int ends[2];
+        ASSERT_EQ(::pipe(ends), 0);
+        ASSERT_EQ(::write(ends[1], file.bytes().data(), file.size()), static_cast<ssize_t>(file.size()));
+        ::close(ends[1]);
+        auto reader = openMessages("/dev/fd/" + std::to_string(ends[0]));
+        ASSERT_TRUE(reader) << reader.reason();
+        const auto message = (*reader)->next();
+        ASSERT_TRUE(message);
+        EXPECT_EQ(message->message, record(0x512C, "05000100"));
+        EXPECT_FALSE((*reader)->next());
+        ::close(ends[0]);
+    }
+}
+
 TEST_F(OpenMessages, saysWhatIsWrongWithOtherFiles) {
     EXPECT_EQ(reasonFor(_directory / "none"), "cannot open: No such file or directory");
     EXPECT_EQ(reasonFor(_directory.path()), "cannot read: Is a directory at offset 0");
-    EXPECT_EQ(reasonFor(fileOf(Data())), "empty, wanted a pcapng section header");
+    EXPECT_EQ(reasonFor(fileOf(Data())), "empty, wanted a recording, a snapshot or a DLF log");
     EXPECT_EQ(reasonFor(fileOf(hex("0A0D0D0A 1C0000"))),
               "begins 0A 0D 0D 0A 1C 00 00 (hex), wanted a pcapng section header");
-    EXPECT_EQ(reasonFor(fileOf(hex("D4C3B2A1 02000400 00000000 00000000"))),
-              "begins D4 C3 B2 A1 02 00 04 00 00 00 00 00 (hex), wanted a pcapng section header");
+    EXPECT_EQ(
+        reasonFor(fileOf(hex("D4C3B2A1 02000400 00000000 00000000"))),
+        "begins D4 C3 B2 A1 02 00 04 00 00 00 00 00 (hex), wanted a recording, a snapshot or a DLF log");
     EXPECT_EQ(reasonFor(fileOf(hex("0A0D0D0A 1C000000 4D3C2B1B 01000000"))),
               "begins 0A 0D 0D 0A 1C 00 00 00 4D 3C 2B 1B (hex), wanted a pcapng section header");
 }

@@ -9,8 +9,10 @@
 
 #include <gtest/gtest.h>
 
+#include <functional>
 #include <stdexcept>
 #include <string>
+#include <utility>
 #include <vector>
 
 namespace velmora {
@@ -23,8 +25,11 @@ public:
     int starts = 0;
     int stops = 0;
     LogSink* sink = nullptr;
+    std::string_view spoken = kVoxLogChannelTechnology_Ostrel_GSM;
+    std::function<void()> changed;
 
-    [[nodiscard]] std::string_view technology() const override { return kVoxLogChannelTechnology_Ostrel_GSM; }
+    [[nodiscard]] std::string_view technology() const override { return spoken; }
+    void whenTechnologyChanges(std::function<void()> call) override { changed = std::move(call); }
     void start(LogSink& to) override {
         ++starts;
         sink = &to;

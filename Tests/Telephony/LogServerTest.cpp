@@ -93,6 +93,58 @@ TEST_F(LogServerTest, tellsTheTechnology) {
     EXPECT_EQ(source.starts, 0);
 }
 
+TEST_F(LogServerTest, tellsNoTechnologyWhileTheSourceHasNone) {
+    listen();
+    source.spoken = {};
+    const std::string channel = createChannel("app");
+    EXPECT_EQ(request(channel, plist({{"GetTechnology", "GetTechnology"}})), dictionary({}));
+    EXPECT_TRUE(ports.isTaken(channel)) << "the client may ask again";
+}
+
+TEST_F(LogServerTest, aChangedTechnologyClosesAllChannels) {
+    listen();
+    const std::string streaming = createChannel("app");
+    const std::string idle = createChannel("other");
+    stream(streaming);
+    source.sink->take(record(0x0001, "01", 0xFF));
+    log.clear();
+    source.spoken = kVoxLogChannelTechnology_Ostrel_LTE;
+    source.changed();
+    EXPECT_FALSE(ports.isTaken(streaming));
+    EXPECT_FALSE(ports.isTaken(idle)) << "its client has been told the old technology";
+    EXPECT_EQ(ports.connectionCount("app"), 0U);
+    EXPECT_THAT(log.textsAt(LogPriority::Notice),
+                ElementsAre(streaming + ": closed, the technology is Ostrel_LTE now",
+                            idle + ": closed, the technology is Ostrel_LTE now"));
+    EXPECT_EQ(source.stops, 0) << "not from inside the source";
+    queue.runPending();
+    EXPECT_EQ(source.stops, 1);
+    EXPECT_EQ(server.channelCount(), 0U);
+
+    const std::string channel = createChannel("app");
+    EXPECT_EQ(request(channel, plist({{"GetTechnology", "GetTechnology"}})),
+              dictionary({{"GetTechnology", "kVoxLogChannelTechnology_Ostrel_LTE"}}));
+    stream(channel);
+    EXPECT_EQ(source.starts, 2);
+    EXPECT_THAT(sentTo("app"), ElementsAre(record(0x0001, "01", 0xFF)))
+        << "nothing of the old technology again";
+    server.stop();
+    EXPECT_FALSE(source.changed) << "a server that has stopped is not called";
+}
+
+TEST_F(LogServerTest, aChangeWhileAMessageIsOnItsWayEndsThatToo) {
+    listen();
+    stream(createChannel("app"));
+    ports.serve("app", [this](std::int32_t, const Data&, bool) {
+        source.changed();
+        return RemotePort::Answer{};
+    });
+    source.sink->take(record(0x0001, "01", 0xFF));
+    queue.runPending();
+    EXPECT_EQ(source.stops, 1);
+    EXPECT_EQ(server.channelCount(), 0U);
+}
+
 TEST_F(LogServerTest, streamsWhatTheFilterPasses) {
     listen();
     const std::string channel = createChannel("app");

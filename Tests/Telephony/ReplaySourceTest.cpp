@@ -227,7 +227,15 @@ TEST_F(ReplaySourceTest, refusesAFileWithoutTechnology) {
                              },
                              {});
     ASSERT_FALSE(made);
-    EXPECT_EQ(made.reason(), "drive.dlf: the file does not say which technology its messages are of");
+    EXPECT_EQ(made.reason(), "drive.dlf: the file does not say which technology its messages are of; "
+                             "technology=NAME supplies it");
+}
+
+TEST_F(ReplaySourceTest, aNamedTechnologyGoesBeforeTheFiles) {
+    for (const char* const told : {"", "Ostrel_GSM"}) {
+        file.technology = told;
+        EXPECT_EQ(make({1, false, "Ostrel_LTE"}).technology(), "kVoxLogChannelTechnology_Ostrel_LTE");
+    }
 }
 
 TEST_F(ReplaySourceTest, theFactoryRefusesWhatCannotBeRead) {

@@ -54,19 +54,65 @@ TEST(SourceStringTest, readsReplays) {
     }
 }
 
+TEST(SourceStringTest, readsTheTechnologyOfAReplay) {
+    struct Case {
+        const char* text;
+        const char* file;
+        const char* technology;
+    };
+    for (const Case& each :
+         {Case{"replay:a.dlf", "a.dlf", ""}, Case{"replay:a.dlf,technology=IFX", "a.dlf", "IFX"},
+          Case{"replay:a,technology=Ostrel_LTE,loop,speed=2", "a", "Ostrel_LTE"},
+          Case{"replay:a,loop,technology=kVoxLogChannelTechnology_Ostrel_GSM", "a", "Ostrel_GSM"},
+          Case{"replay:a,technology=IFX,b", "a,technology=IFX,b", ""}}) {
+        const auto choice = parseSource(each.text);
+        ASSERT_TRUE(choice) << each.text;
+        const auto* replay = std::get_if<ReplayChoice>(&*choice);
+        ASSERT_TRUE(replay) << each.text;
+        EXPECT_EQ(replay->file, each.file) << each.text;
+        EXPECT_EQ(replay->technology, each.technology) << each.text;
+    }
+}
+
+TEST(SourceStringTest, readsModemManager) {
+    struct Case {
+        const char* text;
+        std::optional<std::uint32_t> modem;
+    };
+    for (const Case& each : {Case{"modemmanager", std::nullopt}, Case{"modemmanager,modem=0", 0},
+                             Case{"modemmanager,modem=4294967295", 4294967295}}) {
+        const auto choice = parseSource(each.text);
+        ASSERT_TRUE(choice) << each.text;
+        const auto* modem = std::get_if<ModemManagerChoice>(&*choice);
+        ASSERT_TRUE(modem) << each.text;
+        EXPECT_EQ(modem->modem, each.modem) << each.text;
+    }
+}
+
 TEST(SourceStringTest, saysWhatIsWrong) {
     struct Case {
         const char* text;
         std::string reason;
     };
-    const std::string kinds = ", wanted scenario:NAME[,seed=N][,speed=X] or replay:FILE[,speed=X][,loop]";
+    const std::string kinds = ", wanted scenario:NAME[,seed=N][,speed=X], "
+                              "replay:FILE[,speed=X][,loop][,technology=NAME] or modemmanager[,modem=INDEX]";
+    const std::string indices = ", wanted the number at the end of its path";
     const std::string scenarios = ", wanted one of: " + scenarioNames();
     const std::string seeds = ", wanted a whole number from 0 to 18446744073709551615";
+    const std::string technologies =
+        ", wanted one of: IFX, Ostrel_GSM, Ostrel_CDMA, Ostrel_LTE, Ostrel_UTRAN2";
     const std::string files = ", wanted the name of a file, which is read anew for each client";
     for (const Case& each : {
              Case{"", "source is \"\"" + kinds},
              Case{"gsm", "source is \"gsm\"" + kinds},
-             Case{"modemmanager", "source is \"modemmanager\"" + kinds},
+             Case{"modemmanager:0", "source is \"modemmanager:0\"" + kinds},
+             Case{"modemmanagers", "source is \"modemmanagers\"" + kinds},
+             Case{"modemmanager,", "option is \"\", wanted modem=INDEX"},
+             Case{"modemmanager,loop", "option is \"loop\", wanted modem=INDEX"},
+             Case{"modemmanager,modem=", "modem is \"\"" + indices},
+             Case{"modemmanager,modem=-1", "modem is \"-1\"" + indices},
+             Case{"modemmanager,modem=4294967296", "modem is \"4294967296\"" + indices},
+             Case{"modemmanager,modem=1,modem=1", "modem is given twice, wanted once"},
              Case{"Scenario:gsm", "source is \"Scenario:gsm\"" + kinds},
              Case{"scenario:", "scenario is \"\"" + scenarios},
              Case{"scenario:nr", "scenario is \"nr\"" + scenarios},
@@ -93,6 +139,9 @@ TEST(SourceStringTest, saysWhatIsWrong) {
              Case{"replay:a,speed=fast", "speed is \"fast\", wanted a number from 0 up, or max"},
              Case{"replay:a,speed=-2", "speed is \"-2\", wanted a number from 0 up, or max"},
              Case{"replay:a,speed=1,speed=max", "speed is given twice, wanted once"},
+             Case{"replay:a,technology=", "technology is \"\"" + technologies},
+             Case{"replay:a,technology=GSM", "technology is \"GSM\"" + technologies},
+             Case{"replay:a,technology=IFX,technology=IFX", "technology is given twice, wanted once"},
          }) {
         const auto choice = parseSource(each.text);
         ASSERT_FALSE(choice) << each.text;
@@ -119,6 +168,7 @@ TEST(SourceHelpTest, hasAnExampleOfEachSource) {
     const std::string help = sourceHelp("velmora-telephonyd");
     EXPECT_THAT(help, ::testing::HasSubstr("velmora-telephonyd --source scenario:gsm"));
     EXPECT_THAT(help, ::testing::HasSubstr("velmora-telephonyd --source replay:"));
+    EXPECT_THAT(help, ::testing::HasSubstr("velmora-telephonyd --source modemmanager"));
     for (const ScenarioKind& kind : scenarioKinds())
         EXPECT_THAT(help, ::testing::HasSubstr(std::string(kind.description)));
 }

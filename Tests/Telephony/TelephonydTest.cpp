@@ -4,6 +4,7 @@
 #include "Telephony/GSMScenario.h"
 #include "Tests/Support/FakeClock.h"
 #include "Tests/Support/Hex.h"
+#include "Tests/Support/NotifySocket.h"
 #include "Tests/Support/TemporaryDirectory.h"
 
 #include <gmock/gmock.h>
@@ -11,12 +12,15 @@
 
 #include <algorithm>
 #include <csignal>
+#include <cstdlib>
+#include <fstream>
 #include <memory>
 
 namespace velmora {
 namespace {
 
 using namespace std::chrono_literals;
+using ::testing::ElementsAre;
 using ::testing::HasSubstr;
 using ::testing::IsEmpty;
 
@@ -63,6 +67,29 @@ TEST_F(TelephonydTest, streamsTheScenarioAndStopsCleanly) {
                     HasSubstr("<5>stopping on signal " + std::to_string(signalNumber) + "\n"));
         client.close();
     }
+}
+
+TEST_F(TelephonydTest, tellsTheServiceManagerWhenItIsReadyAndWhenItStops) {
+    NotifySocket manager((directory / "notify").string());
+    ::setenv("NOTIFY_SOCKET", manager.address().c_str(), 1);
+    const auto service = start({"--source", "scenario:gsm"});
+    ::unsetenv("NOTIFY_SOCKET");
+    std::vector<std::string> said;
+    ASSERT_TRUE(eventually([&] { return !(said = manager.take()).empty(); })) << service->standardError();
+    EXPECT_THAT(said, ElementsAre("READY=1\nSTATUS=serving scenario:gsm"));
+    EXPECT_THAT(serviceSockets(), ElementsAre("com.velmora.vox.server")) << "it can be connected to";
+    service->signal(SIGTERM);
+    EXPECT_EQ(service->exitStatus(), 0);
+    EXPECT_THAT(manager.take(), ElementsAre("STOPPING=1"));
+}
+
+TEST_F(TelephonydTest, takesItsSourceFromTheEnvironmentToo) {
+    ::setenv("VELMORA_SOURCE", "scenario:lte", 1);
+    const auto unnamed = start({});
+    ::unsetenv("VELMORA_SOURCE");
+    TestClient client(directory.path(), "com.velmora.test.client");
+    ASSERT_TRUE(client.connect()) << unnamed->standardError();
+    EXPECT_EQ(client.technology(), "kVoxLogChannelTechnology_Ostrel_LTE");
 }
 
 TEST_F(TelephonydTest, survivesAClientThatIsKilled) {
@@ -135,6 +162,32 @@ TEST_F(TelephonydTest, replaysAFileAsFastAsItsClientTakesItAndLosesNothing) {
     })) << service->standardError();
 }
 
+TEST_F(TelephonydTest, replaysALogThatDoesNotTellItsTechnology) {
+    // A code of nobody's, in a log of bare records.
+    const Data message = recordOf(0x1375, {});
+    std::vector<std::uint8_t> content;
+    for (int i = 0; i < 3; ++i)
+        content.insert(content.end(), message.bytes().begin() + 1, message.bytes().end());
+    const std::string path = (directory / "drive.dlf").string();
+    std::ofstream(path, std::ios::binary)
+        .write(reinterpret_cast<const char*>(content.data()), static_cast<std::streamsize>(content.size()));
+
+    const auto untold = start({"--source", "replay:" + path});
+    EXPECT_EQ(untold->exitStatus(), 1);
+    EXPECT_EQ(untold->standardError(),
+              "velmora-telephonyd: " + path +
+                  ": the file does not say which technology its messages are of; technology=NAME "
+                  "supplies it\n");
+
+    const auto service = start({"--source", "replay:" + path + ",speed=max,technology=Ostrel_CDMA"});
+    TestClient client(directory.path(), "com.velmora.test.client");
+    ASSERT_TRUE(client.connect()) << service->standardError();
+    EXPECT_EQ(client.technology(), "kVoxLogChannelTechnology_Ostrel_CDMA");
+    ASSERT_TRUE(client.stream());
+    ASSERT_TRUE(eventually([&] { return client.messages.size() >= 3; }));
+    EXPECT_THAT(client.messages, ElementsAre(message, message, message));
+}
+
 TEST_F(TelephonydTest, aSecondServiceIsToldSo) {
     const auto service = start({"--source", "scenario:gsm"});
     ASSERT_TRUE(eventually([&] { return !serviceSockets().empty(); }));
@@ -156,11 +209,10 @@ TEST_F(TelephonydTest, badCommandLinesAndInputsAreToldApart) {
     const std::string missing = (directory / "missing").string();
     for (const Case& each : {
              Case{{}, 2, "--source is required\nRun with --help for more information.\n"},
-             Case{
-                 {"--source", "modemmanager"},
-                 2,
-                 "velmora-telephonyd: source is \"modemmanager\", wanted scenario:NAME[,seed=N][,speed=X] or "
-                 "replay:FILE[,speed=X][,loop]\n"},
+             Case{{"--source", "modem"},
+                  2,
+                  "velmora-telephonyd: source is \"modem\", wanted scenario:NAME[,seed=N][,speed=X], "
+                  "replay:FILE[,speed=X][,loop][,technology=NAME] or modemmanager[,modem=INDEX]\n"},
              Case{{"--source", "scenario:gsm,speed=abc"},
                   2,
                   "velmora-telephonyd: speed is \"abc\", wanted a number above 0\n"},

@@ -1,0 +1,33 @@
+#include "Recording/DLFReader.h"
+
+#include "Recording/FileSource.h"
+#include "Recording/InputBegin.h"
+
+namespace velmora {
+
+Result<std::unique_ptr<DLFReader>> DLFReader::open(const std::string& path) {
+    Result<std::unique_ptr<ByteSource>> source = FileSource::open(path);
+    if (!source)
+        return Failure{source.reason()};
+    return open(ChunkedInput(*std::move(source)));
+}
+
+Result<std::unique_ptr<DLFReader>> DLFReader::open(ChunkedInput input, std::string_view wanted) {
+    std::unique_ptr<DLFReader> reader(new DLFReader(std::move(input)));
+    const bool isLog = reader->_records.beginsSurely();
+    if (reader->failure() && !isLog)
+        return *reader->failure();
+    if (!isLog)
+        return Failure{unexpectedBegin(reader->_records.available(), wanted)};
+    reader->lookAhead();
+    return reader;
+}
+
+std::optional<LoggedMessage> DLFReader::read() {
+    std::optional<RecordChain::Record> record = nextRecord(_records, {});
+    if (!record)
+        return std::nullopt;
+    return LoggedMessage{timeOf(*record), std::move(record->message), number(), record->offset};
+}
+
+} // namespace velmora

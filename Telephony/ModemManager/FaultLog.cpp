@@ -1,0 +1,20 @@
+#include "Telephony/ModemManager/FaultLog.h"
+
+#include "Platform/SystemLog.h"
+
+namespace velmora {
+
+void FaultLog::tell(std::string_view subject, const std::string& text) {
+    std::string& told = _told[std::string(subject)];
+    if (told == text)
+        return;
+    told = text;
+    logFormat(LogPriority::Warning, "modemmanager: %s", text.c_str());
+}
+
+void FaultLog::over(std::string_view subject) {
+    if (const auto told = _told.find(subject); told != _told.end())
+        _told.erase(told);
+}
+
+} // namespace velmora

@@ -1,0 +1,10 @@
+#pragma once
+
+#include "Platform/Value.h"
+
+namespace velmora::convert {
+
+/// The E-UTRA band that a downlink EARFCN lies in; none where it lies in no band.
+[[nodiscard]] Value bandOfEARFCN(const Value& member);
+
+} // namespace velmora::convert

@@ -1,0 +1,66 @@
+#pragma once
+
+#include "Platform/Value.h"
+
+#include <cstdint>
+#include <span>
+#include <string_view>
+
+namespace velmora {
+
+/// Where a member of ModemManager's stands.
+enum class MemberOf : std::uint8_t {
+    AnyCell,    ///< a cell of GetCellInfo, of any type
+    GSMCell,    ///< one of type GSM
+    UMTSCell,   ///< UMTS
+    LTECell,    ///< LTE
+    OtherCell,  ///< CDMA, TD-SCDMA or 5G NR
+    CSPlace,    ///< a part of GetLocation's text "MCC,MNC,LAC,CI,TAC", while registered on GSM or UMTS
+    EPSPlace,   ///< the same while registered on LTE
+    GSMSignal,  ///< the dictionary Modem.Signal.Gsm, and so on
+    UMTSSignal, ///<
+    LTESignal,  ///<
+    NRSignal,   ///<
+    CDMASignal, ///< Cdma and Evdo
+    Modem,      ///< the interface Modem
+    Modem3gpp,
+    Location, ///< Modem.Location
+    Signal,   ///< Modem.Signal, but for its dictionaries
+    SIM,
+    Bearer,
+    BearerProperties, ///< the dictionary Bearer.Properties, and so on
+    IPv4,             ///< Ip4Config
+    IPv6,             ///< Ip6Config
+    Statistics,       ///< Stats
+};
+
+/// What a member feeds.
+enum class Feeds : std::uint8_t {
+    Cell,        ///< a cell dictionary of the cell information array (0xFF0001)
+    ServingCell, ///< the same, of the serving cell alone, where the cell itself has no such key
+    SIMFile,     ///< the SIM's files (0xFF0000)
+    Bearer,      ///< a bearer's dictionary of display values among the packet-data contexts (0xFF0002)
+    Link,        ///< every bearer's dictionary: the radio link that carries it
+    Service,     ///< no record: the service itself goes by it
+    Nothing,     ///< it is left unused
+};
+
+/// A row of the table of what ModemManager's members become.
+struct MemberRow {
+    MemberOf of;
+    std::string_view member; ///< ModemManager's name for it
+    Feeds feeds;
+    std::string_view key;           ///< the key that it feeds, where it feeds a record
+    Value (*convert)(const Value&); ///< none for what cannot be; null where it feeds no record
+    std::string_view note;          ///< the units and encodings, or what it serves, or why it is unused
+};
+
+/// The whole table.
+[[nodiscard]] std::span<const MemberRow> memberTable();
+
+/// Sets every key that the members feed, in table order; those that are missing or absurd are left out.
+/// Members that are no dictionary feed nothing.
+void feed(Dictionary& fed, Feeds what, MemberOf of, const Dictionary& members);
+void feed(Dictionary& fed, Feeds what, MemberOf of, const Value& members);
+
+} // namespace velmora

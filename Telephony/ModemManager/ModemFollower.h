@@ -1,0 +1,75 @@
+#pragma once
+
+#include "Platform/MainQueue.h"
+#include "Telephony/ModemManager/FaultLog.h"
+#include "Telephony/ModemManager/ModemManagerBus.h"
+#include "Telephony/ModemManager/ModemObjects.h"
+
+#include <cstdint>
+#include <memory>
+#include <optional>
+#include <string>
+#include <string_view>
+
+namespace velmora {
+
+/// Knows at any time which modem there is and what ModemManager says of it. It listens and asks the modem for
+/// nothing: ModemManager tells from what it knows already. Where there is no bus, no ModemManager or no modem
+/// it says so once and goes on looking. Main thread only.
+class ModemFollower final : private ModemManagerBus::Observer {
+public:
+    class Observer {
+    public:
+        virtual ~Observer() = default;
+        /// The followed modem is another one now, or there is none any more.
+        virtual void modemChosen() = 0;
+        /// Something of the followed modem has changed, its interfaces included.
+        virtual void modemChanged() = 0;
+        /// Properties of an object that is no modem have changed; the arguments are those of the signal.
+        virtual void objectChanged(const std::string& path, const Array& arguments) = 0;
+    };
+
+    struct Options {
+        std::optional<std::uint32_t> modem; ///< the index of the modem to follow; any where there is none
+        std::string busAddress;             ///< the system bus where it is empty
+    };
+
+    /// How long after a failure the bus and ModemManager are tried again.
+    static constexpr std::chrono::seconds retryInterval{10};
+
+    /// Begins at once. Queue and observer must outlive it.
+    ModemFollower(MainQueue& queue, Options options, Observer& observer);
+    ModemFollower(const ModemFollower&) = delete;
+    ModemFollower& operator=(const ModemFollower&) = delete;
+
+    /// The followed modem; null while there is none. Valid until the next call of the observer.
+    [[nodiscard]] const Modem* modem() const { return _objects.find(_chosen); }
+    [[nodiscard]] ModemManagerBus& bus() { return _bus; }
+    [[nodiscard]] FaultLog& faults() { return _faults; }
+
+private:
+    void serviceAppeared() override;
+    void serviceVanished() override;
+    void busLost() override;
+    void signalArrived(const std::string& path, std::string_view member, const Array& arguments) override;
+
+    void open(bool startsService);
+    void list(bool startsService);
+    void retryLater();
+    void forgetModems();
+    void choose();
+
+    MainQueue& _queue;
+    Options _options;
+    Observer& _observer;
+    FaultLog _faults;
+    ModemManagerBus _bus;
+    ModemObjects _objects;
+    std::string _chosen;  ///< the path of the followed modem; empty while there is none
+    bool _listed = false; ///< the modems that there are have been told
+    bool _retrying = false;
+    /// Tasks on the queue hold it weakly: they do nothing once this is gone.
+    std::shared_ptr<bool> _alive = std::make_shared<bool>(true);
+};
+
+} // namespace velmora

@@ -1,0 +1,90 @@
+#pragma once
+
+#include "Platform/Result.h"
+#include "Platform/Value.h"
+
+#include <QVariantList>
+
+#include <chrono>
+#include <functional>
+#include <memory>
+#include <string>
+#include <string_view>
+
+namespace velmora {
+
+/// A method of ModemManager's and its arguments.
+struct BusCall {
+    std::string path;
+    std::string_view interface;
+    std::string_view method;
+    QVariantList arguments;
+    std::chrono::milliseconds timeout{25'000}; ///< after which the answer is an error
+    bool startsService = false;                ///< the bus may start ModemManager for it
+};
+
+/// What a call ends with: its first result, or the name and the words of an error.
+struct BusReply {
+    Value value;       ///< none where the method has no result, and on an error
+    std::string error; ///< as the bus names it; empty where there is none
+    std::string text;
+
+    [[nodiscard]] bool failed() const { return !error.empty(); }
+    /// The modem or ModemManager cannot do it.
+    [[nodiscard]] bool isUnsupported() const;
+    /// The bus or ModemManager does not let us.
+    [[nodiscard]] bool isDenied() const;
+    /// Nobody is there to answer.
+    [[nodiscard]] bool isAbsent() const;
+    /// The error as a log line ends in it: "NAME: WORDS".
+    [[nodiscard]] std::string reason() const;
+};
+
+/// A connection to the bus that ModemManager lives on. Whoever holds it owns it; nothing is called back after
+/// it was closed or destroyed, and nothing from inside its own functions. Nothing waits for ModemManager.
+/// Main thread only, on Qt's event loop.
+class ModemManagerBus {
+public:
+    class Observer {
+    public:
+        virtual ~Observer() = default;
+        /// ModemManager has come to the bus. Not called for one that was there when the bus was opened.
+        virtual void serviceAppeared() = 0;
+        /// It has left the bus. Calls that were on their way are not answered any more.
+        virtual void serviceVanished() = 0;
+        /// The connection to the bus has ended; nothing more comes until it is opened again.
+        virtual void busLost() = 0;
+        /// ModemManager sent one of its objects' signals.
+        virtual void signalArrived(const std::string& path, std::string_view member,
+                                   const Array& arguments) = 0;
+    };
+
+    /// `address` is a bus's address, the system bus's where it is empty. The observer must outlive the bus.
+    ModemManagerBus(std::string address, Observer& observer);
+    ~ModemManagerBus();
+    ModemManagerBus(const ModemManagerBus&) = delete;
+    ModemManagerBus& operator=(const ModemManagerBus&) = delete;
+
+    /// Connects, and listens to the signals of the object manager and of changed properties. The failure says
+    /// why there is no connection. Precondition: not open.
+    Result<Done> open();
+    [[nodiscard]] bool isOpen() const { return _connection != nullptr; }
+    /// Does nothing on a closed bus. Precondition: not called from inside a callback of the bus.
+    void close();
+
+    using Answered = std::function<void(const BusReply&)>;
+    /// Calls and comes back at once; `answered` follows, unless the service vanishes or the bus is closed
+    /// before. Does nothing on a closed bus.
+    void call(const BusCall& call, Answered answered);
+    /// Calls without caring for the answer. What was sent before the bus is closed still goes out.
+    void send(const BusCall& call);
+
+private:
+    class Connection;
+
+    std::string _address;
+    Observer& _observer;
+    std::unique_ptr<Connection> _connection; ///< null while the bus is not open
+};
+
+} // namespace velmora

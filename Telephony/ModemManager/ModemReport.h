@@ -1,0 +1,45 @@
+#pragma once
+
+#include "Platform/Value.h"
+#include "Telephony/ModemManager/ModemObjects.h"
+
+#include <string>
+#include <string_view>
+#include <vector>
+
+/// What the extra stream says of a modem, made of what ModemManager told. The member table decides what is in
+/// it.
+namespace velmora {
+
+/// The log technology that goes with the modem: that of its access technology, or, for one that has not been
+/// on a network, of the best that it can do. Empty where neither is one that the live display has.
+[[nodiscard]] std::string_view technologyOf(const Modem& modem);
+/// The same of its access technology alone.
+[[nodiscard]] std::string_view accessTechnologyOf(const Modem& modem);
+
+/// More cells, and more bearers, than any modem has; what is beyond is left out.
+inline constexpr std::size_t maximumCells = 64;
+inline constexpr std::size_t maximumBearers = 8;
+
+using Dictionaries = std::vector<DictionaryRef>;
+
+/// The cells of an answer of GetCellInfo. The modem adds the levels of the serving cell.
+[[nodiscard]] Dictionaries cellsOf(const Value& cellInformation, const Modem& modem);
+[[nodiscard]] bool hasServingCell(const Dictionaries& cells);
+/// The serving cell that an answer of GetLocation names; null where it names none. The modem tells of which
+/// technology it is.
+[[nodiscard]] DictionaryRef placeOf(const Value& location, const Modem& modem);
+
+/// The SIM's files; `sim` are the properties of the SIM object.
+[[nodiscard]] DictionaryRef simFilesOf(const Modem& modem, const Dictionary& sim);
+
+/// A bearer object's number and properties.
+struct ModemBearer {
+    std::string path;
+    DictionaryRef properties;
+};
+/// The display values of each bearer and of the link under it; of the link alone where there is no bearer, so
+/// that a modem without one still shows its registration and its signal.
+[[nodiscard]] Dictionaries contextsOf(const Modem& modem, const std::vector<ModemBearer>& bearers);
+
+} // namespace velmora

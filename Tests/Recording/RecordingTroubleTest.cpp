@@ -1,0 +1,310 @@
+#include "Recording/RecordingReader.h"
+#include "Recording/RecordingWriter.h"
+#include "Tests/Recording/FakeRecordingFile.h"
+#include "Tests/Recording/PcapngFile.h"
+
+#include <cerrno>
+#include <chrono>
+#include <string>
+#include <vector>
+
+#include <gmock/gmock.h>
+
+namespace velmora {
+namespace {
+
+using testing::ElementsAre;
+
+constexpr std::size_t headSize = 100; // of a technology's name of 9 to 12 bytes
+constexpr std::size_t blockSize = 36; // of a message of 1 to 4 bytes
+const std::string full = "cannot write the recording: No space left on device";
+const std::string broken = "cannot write the recording: Input/output error";
+
+/// A recording on a disk that gives trouble. Each message is one byte, its number.
+class RecordingTroubleTest : public testing::Test {
+protected:
+    void start() {
+        auto started = RecordingWriter::start(std::make_unique<FakeRecordingFile>(medium), "the recording",
+                                              "Ostrel_GSM");
+        ASSERT_TRUE(started) << started.reason();
+        writer = *std::move(started);
+    }
+    Result<Done> append(std::uint8_t number) {
+        return writer->append(Time(std::chrono::nanoseconds(number)), Bytes(&number, 1));
+    }
+    /// The numbers of the messages on the disk, which must be whole.
+    [[nodiscard]] std::vector<int> numbers() const {
+        const auto reader =
+            RecordingReader::open(ChunkedInput(std::make_unique<MemorySource>(Data::copyOf(medium.content))));
+        if (!reader) {
+            ADD_FAILURE() << reader.reason();
+            return {};
+        }
+        std::vector<int> found;
+        while (const auto message = (*reader)->next())
+            found.push_back(message->message.bytes()[0]);
+        EXPECT_EQ((*reader)->lossTotals().losses, 0U);
+        return found;
+    }
+    static std::string reasonOf(const Result<Done>& result) { return result ? "success" : result.reason(); }
+
+    FakeMedium medium;
+    std::unique_ptr<RecordingWriter> writer;
+};
+
+TEST_F(RecordingTroubleTest, FullDiskKeepsWholeBlocksAndGoesOnWithoutAGap) {
+    start();
+    ASSERT_TRUE(append(1));
+    ASSERT_TRUE(writer->flush());
+    // Room for the second message and a part of the third.
+    medium.room = headSize + 2 * blockSize + 20;
+    ASSERT_TRUE(append(2));
+    ASSERT_TRUE(append(3));
+    EXPECT_FALSE(writer->isWaiting());
+    EXPECT_EQ(reasonOf(writer->flush()), full);
+    EXPECT_TRUE(writer->isWaiting());
+    EXPECT_FALSE(writer->isDropping());
+    EXPECT_EQ(medium.content.size(), headSize + 2 * blockSize) << "the part of a block is taken back";
+    EXPECT_THAT(numbers(), ElementsAre(1, 2));
+    EXPECT_EQ(writer->unsaved().messages, 1U);
+
+    // Meanwhile messages are kept, and every call says why they are not in the file.
+    EXPECT_EQ(reasonOf(append(4)), full);
+    EXPECT_EQ(reasonOf(writer->flush()), full);
+    EXPECT_EQ(writer->messages(), 4U);
+    EXPECT_EQ(writer->unsaved().messages, 2U);
+    EXPECT_THAT(numbers(), ElementsAre(1, 2));
+
+    medium.room = SIZE_MAX;
+    EXPECT_EQ(reasonOf(append(5)), full) << "only a flush tries again";
+    ASSERT_TRUE(writer->flush());
+    EXPECT_FALSE(writer->isWaiting());
+    EXPECT_EQ(writer->unsaved().messages, 0U);
+    EXPECT_EQ(writer->droppedMessages(), 0U);
+    ASSERT_TRUE(append(6));
+    ASSERT_TRUE(writer->close());
+    EXPECT_TRUE(medium.closed);
+    EXPECT_THAT(numbers(), ElementsAre(1, 2, 3, 4, 5, 6));
+}
+
+TEST_F(RecordingTroubleTest, EveryRoomLeavesWholeBlocks) {
+    for (std::size_t room = 0; room <= headSize + 3 * blockSize; ++room) {
+        medium = FakeMedium();
+        medium.room = room;
+        start();
+        for (std::uint8_t number = 1; number <= 3; ++number)
+            static_cast<void>(append(number));
+        static_cast<void>(writer->flush());
+        const std::size_t blocks = room < headSize ? 0 : (room - headSize) / blockSize;
+        // The head is two blocks, of 52 and 48 bytes.
+        ASSERT_EQ(medium.content.size(), room < 52         ? 0
+                                         : room < headSize ? 52
+                                                           : headSize + blocks * blockSize)
+            << room;
+        ASSERT_EQ(writer->isWaiting(), blocks < 3) << room;
+        medium.room = SIZE_MAX;
+        ASSERT_TRUE(writer->close()) << room;
+        ASSERT_THAT(numbers(), ElementsAre(1, 2, 3)) << room;
+    }
+}
+
+TEST_F(RecordingTroubleTest, ErrorsThatMayPass) {
+    for (const int error : {ENOSPC, EDQUOT, EFBIG, EIO, EROFS}) {
+        medium = FakeMedium();
+        start();
+        medium.room = 0;
+        medium.fullError = error;
+        ASSERT_TRUE(append(1));
+        EXPECT_FALSE(writer->flush()) << error;
+        EXPECT_TRUE(writer->isWaiting()) << error;
+    }
+}
+
+TEST_F(RecordingTroubleTest, OtherErrorsAreForGood) {
+    start();
+    ASSERT_TRUE(append(1));
+    medium.room = 0;
+    medium.fullError = EBADF;
+    const std::string reason = "cannot write the recording: Bad file descriptor";
+    EXPECT_EQ(reasonOf(writer->flush()), reason);
+    EXPECT_FALSE(writer->isWaiting());
+    medium.room = SIZE_MAX;
+    EXPECT_EQ(reasonOf(append(2)), reason);
+    EXPECT_EQ(reasonOf(writer->flush()), reason);
+    EXPECT_EQ(reasonOf(writer->sync()), reason);
+    EXPECT_EQ(reasonOf(writer->close()), reason);
+    EXPECT_EQ(writer->unsaved().messages, 1U);
+    EXPECT_THAT(numbers(), ElementsAre());
+}
+
+TEST_F(RecordingTroubleTest, WhatCannotBeTakenBackIsForGood) {
+    medium.isRegular = false;
+    start();
+    ASSERT_TRUE(append(1));
+    medium.room = headSize + 5;
+    EXPECT_EQ(reasonOf(writer->flush()), full);
+    EXPECT_FALSE(writer->isWaiting());
+    EXPECT_EQ(medium.content.size(), headSize + 5);
+    medium.room = SIZE_MAX;
+    EXPECT_EQ(reasonOf(writer->flush()), full);
+    EXPECT_EQ(medium.content.size(), headSize + 5);
+}
+
+TEST_F(RecordingTroubleTest, NothingIsWrittenBehindAPartThatCannotBeTakenBackYet) {
+    start();
+    ASSERT_TRUE(append(1));
+    medium.room = headSize + 5;
+    medium.cutError = EIO;
+    EXPECT_EQ(reasonOf(writer->flush()), full);
+    EXPECT_TRUE(writer->isWaiting());
+    medium.room = SIZE_MAX;
+    EXPECT_EQ(reasonOf(writer->flush()), broken);
+    EXPECT_EQ(medium.content.size(), headSize + 5);
+    medium.cutError = 0;
+    ASSERT_TRUE(writer->close());
+    EXPECT_THAT(numbers(), ElementsAre(1));
+}
+
+TEST_F(RecordingTroubleTest, HeadMayWaitToo) {
+    medium.room = 60;
+    start();
+    EXPECT_TRUE(writer->isWaiting());
+    EXPECT_EQ(reasonOf(append(1)), full);
+    EXPECT_EQ(writer->unsaved().messages, 1U);
+    medium.room = SIZE_MAX;
+    ASSERT_TRUE(writer->close());
+    EXPECT_THAT(numbers(), ElementsAre(1));
+}
+
+TEST_F(RecordingTroubleTest, UnsavedMessagesAreKnownInTheEnd) {
+    start();
+    medium.room = headSize;
+    ASSERT_TRUE(append(1));
+    ASSERT_TRUE(append(2));
+    EXPECT_EQ(reasonOf(writer->close()), full);
+    EXPECT_TRUE(medium.closed);
+    EXPECT_EQ(writer->unsaved().messages, 2U);
+    EXPECT_EQ(writer->unsaved().bytes, 2U);
+}
+
+TEST_F(RecordingTroubleTest, QueueIsBoundedAndItsGapIsOne) {
+    start();
+    medium.room = headSize;
+    ASSERT_TRUE(append(1));
+    ASSERT_FALSE(writer->flush());
+    // 33554432 bytes of blocks: one of 36 and 15 of 2097152 + 32, which leaves 2096636; the 16th finds no
+    // room, and from then on no message does.
+    std::vector<std::uint8_t> large(2'097'152, 2);
+    for (int i = 0; i < 15; ++i) {
+        EXPECT_EQ(reasonOf(writer->append(Time(), large)), full);
+        EXPECT_FALSE(writer->isDropping()) << i;
+    }
+    EXPECT_EQ(reasonOf(writer->append(Time(), large)), full);
+    EXPECT_TRUE(writer->isDropping());
+    EXPECT_EQ(reasonOf(append(3)), full);
+    EXPECT_EQ(writer->droppedMessages(), 2U);
+    EXPECT_EQ(writer->messages(), 16U);
+    EXPECT_EQ(writer->unsaved().messages, 16U);
+
+    medium.room = SIZE_MAX;
+    ASSERT_TRUE(writer->flush());
+    EXPECT_FALSE(writer->isDropping());
+    ASSERT_TRUE(append(4));
+    ASSERT_TRUE(writer->close());
+    EXPECT_EQ(writer->droppedMessages(), 2U);
+    EXPECT_THAT(numbers(), ElementsAre(1, 2, 2, 2, 2, 2, 2, 2, 2, 2, 2, 2, 2, 2, 2, 2, 4));
+}
+
+TEST_F(RecordingTroubleTest, ShortWritesAreNoTrouble) {
+    medium.longestWrite = 7;
+    start();
+    ASSERT_TRUE(append(1));
+    ASSERT_TRUE(append(2));
+    ASSERT_TRUE(writer->flush());
+    EXPECT_THAT(numbers(), ElementsAre(1, 2));
+}
+
+TEST_F(RecordingTroubleTest, SyncIsStartedForWhatIsNewAndOneAtATime) {
+    start();
+    ASSERT_TRUE(writer->sync());
+    EXPECT_EQ(medium.syncsStarted, 1U) << "the head";
+    ASSERT_TRUE(append(1));
+    ASSERT_TRUE(writer->sync());
+    EXPECT_EQ(medium.syncsStarted, 1U) << "the first is still under way";
+    EXPECT_THAT(numbers(), ElementsAre(1)) << "the file has it all the same";
+    medium.syncOutcome = 0;
+    ASSERT_TRUE(writer->sync());
+    EXPECT_EQ(medium.syncsStarted, 2U);
+    medium.syncOutcome = 0;
+    ASSERT_TRUE(writer->sync());
+    ASSERT_TRUE(writer->sync());
+    EXPECT_EQ(medium.syncsStarted, 2U) << "nothing new";
+    ASSERT_TRUE(writer->close());
+    EXPECT_EQ(medium.syncsWaitedFor, 1U);
+}
+
+TEST_F(RecordingTroubleTest, WhatTheMediumLostIsWrittenOnceMore) {
+    start();
+    ASSERT_TRUE(append(1));
+    ASSERT_TRUE(writer->sync());
+    medium.syncOutcome = 0;
+    ASSERT_TRUE(append(2));
+    ASSERT_TRUE(writer->sync());
+    ASSERT_TRUE(append(3));
+    ASSERT_TRUE(writer->flush());
+    EXPECT_THAT(numbers(), ElementsAre(1, 2, 3));
+    // The second message never reached the medium, and nobody knows of the third.
+    medium.syncOutcome = EIO;
+    EXPECT_EQ(reasonOf(writer->sync()), broken);
+    EXPECT_TRUE(writer->isWaiting());
+    EXPECT_THAT(numbers(), ElementsAre(1));
+    EXPECT_EQ(writer->unsaved().messages, 2U);
+    ASSERT_TRUE(writer->sync());
+    EXPECT_FALSE(writer->isWaiting());
+    EXPECT_EQ(medium.syncsStarted, 3U);
+    EXPECT_THAT(numbers(), ElementsAre(1, 2, 3));
+}
+
+TEST_F(RecordingTroubleTest, MediumGetsASecondTryInTheEnd) {
+    start();
+    ASSERT_TRUE(writer->sync());
+    medium.syncOutcome = 0;
+    ASSERT_TRUE(append(1));
+    ASSERT_TRUE(writer->sync());
+    medium.syncError = EIO;
+    ASSERT_TRUE(writer->close());
+    EXPECT_EQ(medium.syncsWaitedFor, 2U);
+    EXPECT_THAT(numbers(), ElementsAre(1));
+}
+
+TEST_F(RecordingTroubleTest, MediumThatFailsInTheEndIsToldWhereNothingWasKept) {
+    start();
+    ASSERT_TRUE(append(1));
+    medium.syncError = ENOSPC;
+    EXPECT_EQ(reasonOf(writer->close()), full);
+    EXPECT_EQ(medium.syncsWaitedFor, 1U);
+}
+
+TEST_F(RecordingTroubleTest, FileSystemWithoutAMediumIsNoTrouble) {
+    start();
+    ASSERT_TRUE(append(1));
+    medium.syncError = EINVAL;
+    ASSERT_TRUE(writer->close());
+    EXPECT_THAT(numbers(), ElementsAre(1));
+}
+
+TEST_F(RecordingTroubleTest, KeepsNoMoreThanItsShareForASlowMedium) {
+    start();
+    ASSERT_TRUE(writer->sync());
+    // The medium says nothing while 9 MiB are written, one more than are kept.
+    const std::vector<std::uint8_t> large(1 << 20, 7);
+    for (int i = 0; i < 9; ++i)
+        ASSERT_TRUE(writer->append(Time(), large));
+    medium.syncOutcome = EIO;
+    EXPECT_FALSE(writer->sync());
+    ASSERT_TRUE(writer->close());
+    EXPECT_EQ(numbers().size(), 9U) << "what is kept no longer stays in the file";
+}
+
+} // namespace
+} // namespace velmora

@@ -1,0 +1,361 @@
+#include "Tests/Telephony/ModemManager/ModemManagerFixture.h"
+
+#include "Platform/TelephonyService.h"
+
+#include <limits>
+
+/// Cells as ModemManager tells of them, from the bus to what a decoder shows.
+
+namespace velmora {
+namespace {
+
+using namespace std::chrono_literals;
+using ::testing::ElementsAre;
+using ::testing::IsEmpty;
+
+class CellsTest : public ModemManagerTest {
+protected:
+    void tellCells(const CellList& cells) {
+        mock.answers["GetCellInfo"] = {{QVariant::fromValue(cells)}, {}, {}};
+    }
+    void putModem(uint access) { mock.put(Mock::modemPath(0), testModem(access)); }
+
+    /// The first cell list that comes.
+    Value cells() {
+        EXPECT_TRUE(comes([this] { return count(cellCode) > 0; }));
+        return latest(cellCode);
+    }
+};
+
+/// A cell dictionary of the array.
+Value cell(std::string_view technology, std::string_view type,
+           std::initializer_list<Dictionary::Entry> members) {
+    const auto dictionary = std::make_shared<Dictionary>(members);
+    dictionary->set(kVoxCellMonitorCellRadioAccessTechnology, technology);
+    dictionary->set(kVoxCellMonitorCellType, type);
+    return dictionary;
+}
+
+Value array(std::initializer_list<Value> values) {
+    return std::make_shared<Array>(values);
+}
+
+TEST_F(CellsTest, gsm) {
+    putModem(gsmAccess);
+    tellCells({
+        {{"cell-type", 2U},
+         {"serving", true},
+         {"operator-id", "21034"},
+         {"lac", "84CD"},
+         {"ci", "2BAF"},
+         {"arfcn", 62U},
+         {"base-station-id", "3F"},
+         {"timing-advance", 3U},
+         {"rx-level", 40U}}, // -111 + 40 = -71 dBm: between the steps -70 and -72
+        {{"cell-type", 2U}, {"serving", false}, {"arfcn", 512U}, {"rx-level", 33U}}, // -78 dBm
+        {{"cell-type", 2U}, {"serving", false}, {"arfcn", 513U}, {"rx-level", 32U}}, // -79 dBm
+        {{"cell-type", 2U}, {"serving", false}, {"arfcn", 514U}, {"rx-level", 0U}},  // -111 dBm
+        {{"cell-type", 2U}, {"serving", false}, {"arfcn", 515U}, {"rx-level", 63U}}, // -48 dBm
+    });
+    follow();
+    EXPECT_EQ(source->technology(), kVoxLogChannelTechnology_Ostrel_GSM);
+    listen();
+    constexpr auto kind = kVoxCellMonitorRadioAccessTechnologyGSM;
+    constexpr auto neighbour = kVoxCellMonitorCellTypeNeighbor;
+    EXPECT_EQ(cells(),
+              array({
+                  cell(kind, kVoxCellMonitorCellTypeServing,
+                       {{"kVoxCellMonitorMCC", 210},
+                        {"kVoxCellMonitorMNC", 34},
+                        {"kVoxCellMonitorLAC", 33997},
+                        {"kVoxCellMonitorCellId", 11183},
+                        {"kVoxCellMonitorARFCN", 62},
+                        {"kVoxCellMonitorRSSI", -36}}),
+                  cell(kind, neighbour, {{"kVoxCellMonitorARFCN", 512}, {"kVoxCellMonitorRSSI", -39}}),
+                  cell(kind, neighbour, {{"kVoxCellMonitorARFCN", 513}, {"kVoxCellMonitorRSSI", -40}}),
+                  cell(kind, neighbour, {{"kVoxCellMonitorARFCN", 514}, {"kVoxCellMonitorRSSI", -56}}),
+                  cell(kind, neighbour, {{"kVoxCellMonitorARFCN", 515}, {"kVoxCellMonitorRSSI", -24}}),
+              }));
+
+    const Value shown = display("Ostrel_GSM");
+    EXPECT_EQ(at(shown, {"GSM", "GSM Serving Cell", "Cell ID"}), Value("11183"));
+    EXPECT_EQ(at(shown, {"GSM", "GSM Serving Cell", "ARFCN"}), Value("62"));
+    EXPECT_EQ(at(shown, {"GSM", "Neighboring Cells", "0", "ARFCN"}), Value("512"));
+    EXPECT_EQ(at(shown, {"GSM", "Neighboring Cells", "0", "RSSI"}), Value("-78 dBm"));
+    EXPECT_EQ(at(shown, {"GSM", "Neighboring Cells", "1", "RSSI"}), Value("-80 dBm"));
+    EXPECT_EQ(at(shown, {"GSM", "Neighboring Cells", "2", "RSSI"}), Value("-112 dBm"));
+    EXPECT_EQ(at(shown, {"GSM", "Neighboring Cells", "3", "RSSI"}), Value("-48 dBm"));
+    EXPECT_THAT(warnings(), IsEmpty());
+}
+
+TEST_F(CellsTest, umts) {
+    putModem(umtsAccess);
+    tellCells({
+        {{"cell-type", 3U},
+         {"serving", true},
+         {"operator-id", "310260"},
+         {"lac", "1005"},
+         {"ci", "D30156"},
+         {"uarfcn", 10700U},
+         {"psc", 256U},
+         {"rscp", -80.4},
+         {"ecio", -6.5},
+         {"path-loss", 110U}},
+        {{"cell-type", 3U},
+         {"serving", false},
+         {"uarfcn", 10725U},
+         {"psc", 33U},
+         {"rscp", -95.5},
+         {"ecio", -7.4}},
+    });
+    follow();
+    EXPECT_EQ(source->technology(), kVoxLogChannelTechnology_Ostrel_GSM);
+    listen();
+    constexpr auto kind = kVoxCellMonitorRadioAccessTechnologyUMTS;
+    EXPECT_EQ(cells(), array({
+                           cell(kind, kVoxCellMonitorCellTypeServing,
+                                {{"kVoxCellMonitorMCC", 310},
+                                 {"kVoxCellMonitorMNC", 260},
+                                 {"kVoxCellMonitorLAC", 4101},
+                                 {"kVoxCellMonitorCellId", 13828438},
+                                 {"kVoxCellMonitorUARFCN", 10700},
+                                 {"kVoxCellMonitorSCN", 256},
+                                 {"kVoxCellMonitorRSCP", -80},
+                                 {"kVoxCellMonitorECN0", -7}}),
+                           cell(kind, kVoxCellMonitorCellTypeNeighbor,
+                                {{"kVoxCellMonitorUARFCN", 10725},
+                                 {"kVoxCellMonitorSCN", 33},
+                                 {"kVoxCellMonitorRSCP", -96},
+                                 {"kVoxCellMonitorECN0", -7}}),
+                       }));
+
+    const Value shown = display("Ostrel_GSM");
+    EXPECT_EQ(at(shown, {"UMTS", "UMTS RR Info", "Cell ID"}), Value("13828438"));
+    EXPECT_EQ(at(shown, {"UMTS", "UMTS RR Info", "UARFCN"}), Value("10700"));
+    EXPECT_EQ(at(shown, {"UMTS", "UMTS RR Info", "Scrambling Code"}), Value("256"));
+    EXPECT_EQ(at(shown, {"Reselection", "UMTS Set", "0", "UARFCN"}), Value("10725"));
+    EXPECT_EQ(at(shown, {"Reselection", "UMTS Set", "0", "Scrambling Code"}), Value("33"));
+    EXPECT_EQ(at(shown, {"Reselection", "UMTS Set", "0", "RSCP"}), Value("-96 dBm"));
+    EXPECT_EQ(at(shown, {"Reselection", "UMTS Set", "0", "Energy Per Chip"}), Value("-7 dB"));
+}
+
+TEST_F(CellsTest, lte) {
+    putModem(lteAccess);
+    tellCells({
+        // Another technology's cell does not stand in the way of the serving one.
+        {{"cell-type", 6U}, {"serving", true}, {"tac", "7"}, {"ci", "123456789"}, {"nrarfcn", 431000U}},
+        {{"cell-type", 5U},
+         {"serving", true},
+         {"operator-id", "00101"},
+         {"tac", "1005"},
+         {"ci", "1A2D003"},
+         {"physical-ci", "1A0"},
+         {"earfcn", 1300U}, // band 3: 1200 to 1949
+         {"rsrp", -101.0},
+         {"rsrq", -9.5},
+         {"timing-advance", 5U}},
+        {{"cell-type", 5U}, {"serving", false}, {"physical-ci", "7"}, {"earfcn", 6300U}}, // 20: 6150 to 6449
+    });
+    follow();
+    EXPECT_EQ(source->technology(), kVoxLogChannelTechnology_Ostrel_LTE);
+    listen();
+    constexpr auto kind = kVoxCellMonitorRadioAccessTechnologyLTE;
+    EXPECT_EQ(cells(), array({
+                           cell(kind, kVoxCellMonitorCellTypeServing,
+                                {{"kVoxCellMonitorMCC", 1},
+                                 {"kVoxCellMonitorMNC", 1},
+                                 {"kVoxCellMonitorTAC", 4101},
+                                 {"kVoxCellMonitorCellId", 27447299},
+                                 {"kVoxCellMonitorPID", 416},
+                                 {"kVoxCellMonitorUARFCN", 1300},
+                                 {"kVoxCellMonitorBandInfo", 3}}),
+                           cell(kind, kVoxCellMonitorCellTypeNeighbor,
+                                {{"kVoxCellMonitorPID", 7},
+                                 {"kVoxCellMonitorUARFCN", 6300},
+                                 {"kVoxCellMonitorBandInfo", 20}}),
+                       }));
+
+    const Value shown = at(display("LTE"), {"Serving Cell", "Serving Cell Info"});
+    EXPECT_EQ(shown, Value(std::make_shared<Dictionary>(Dictionary{{"Tracking Area Code", "4101"},
+                                                                   {"Cell Identity", "27447299"},
+                                                                   {"Physical Cell ID", "416"},
+                                                                   {"Freq Band Indicator", "3"},
+                                                                   {"UARFCN", "1300"}})));
+}
+
+TEST_F(CellsTest, absurdAndMissingMembersAreLeftOut) {
+    putModem(umtsAccess);
+    const double notANumber = std::numeric_limits<double>::quiet_NaN();
+    tellCells({
+        {{"cell-type", 3U}, {"serving", false}}, // nothing but what is always there
+        {{"cell-type", 3U},
+         {"serving", false},
+         {"operator-id", "12"}, // too short
+         {"lac", "10005"},      // 17 bits
+         {"ci", "10000000"},    // 29 bits
+         {"uarfcn", 16384U},    // one more than there are
+         {"psc", 512U},         // one more than there are
+         {"rscp", notANumber},
+         {"ecio", 0.6}}, // rounded or not, it is above 0
+        {{"cell-type", 3U},
+         {"serving", false},
+         {"operator-id", "00a01"}, // no digits
+         {"lac", "0x12"},          // no hexadecimal
+         {"ci", "-5"},             //
+         {"uarfcn", -1},           // signed, and below 0
+         {"psc", "33"},            // text, wanted a number
+         {"rscp", -std::numeric_limits<double>::infinity()},
+         {"ecio", -7}}, // whole, wanted a real
+        {{"cell-type", 3U},
+         {"serving", false},
+         {"lac", QString(5000, 'A')}, // a huge text
+         {"ci", 11183U},              // a number, wanted text
+         {"uarfcn", QVariant::fromValue(std::numeric_limits<qulonglong>::max())},
+         {"psc", true},
+         {"rscp", "-80"},
+         {"ecio", QStringList("-7")}},                        // a list
+        {{"cell-type", 3U}, {"serving", "yes"}, {"psc", 1U}}, // serving is no boolean
+        {{"cell-type", 3U}, {"psc", 2U}},                     // not said to serve or not
+        {{"cell-type", "3"}, {"serving", false}, {"psc", 3U}},
+        {{"cell-type", 99U}, {"serving", false}, {"psc", 4U}}, // a type of the future
+        {{"serving", false}, {"psc", 5U}},
+        {},
+        {{"cell-type", 3U},
+         {"serving", false},
+         {"lac", ""},
+         {"ci", " 1"},
+         {"psc", 511U},
+         {"rscp", -150.0},
+         {"ecio", 0.0}},
+    });
+    follow();
+    listen();
+    constexpr auto kind = kVoxCellMonitorRadioAccessTechnologyUMTS;
+    constexpr auto neighbour = kVoxCellMonitorCellTypeNeighbor;
+    EXPECT_EQ(cells(), array({cell(kind, neighbour, {}), cell(kind, neighbour, {}), cell(kind, neighbour, {}),
+                              cell(kind, neighbour, {}),
+                              cell(kind, neighbour,
+                                   {{"kVoxCellMonitorSCN", 511},
+                                    {"kVoxCellMonitorRSCP", -150},
+                                    {"kVoxCellMonitorECN0", 0}})}));
+    // Left out of the cells, they stay in the list that the display shows.
+    EXPECT_EQ(at(display("Ostrel_GSM"), {"Reselection", "UMTS Set", "4", "RSCP"}), Value("-150 dBm"));
+}
+
+TEST_F(CellsTest, anAnswerOfAnotherTypeIsNoCell) {
+    putModem(lteAccess);
+    follow();
+    listen();
+    const QVariantList absurd[] = {
+        {},
+        {QString("cells")},
+        {QVariant::fromValue(QStringList{"a", "b"})},
+        {QVariantMap{{"cell-type", 5U}}},
+        {5U},
+    };
+    for (const QVariantList& each : absurd) {
+        mock.answers["GetCellInfo"] = {each, {}, {}};
+        const std::size_t before = mock.count("GetCellInfo");
+        ASSERT_TRUE(passes([&] { return mock.count("GetCellInfo") >= before + 2; }));
+    }
+    EXPECT_EQ(count(cellCode), 0U);
+    tellCells({{{"cell-type", 5U}, {"serving", true}, {"tac", "7"}}});
+    ASSERT_TRUE(passes([&] { return count(cellCode) > 0; }));
+    EXPECT_EQ(at(latest(cellCode), {"0", "kVoxCellMonitorTAC"}), Value(7));
+}
+
+TEST_F(CellsTest, manyCellsAreCut) {
+    putModem(lteAccess);
+    CellList many;
+    for (uint i = 0; i < 5000; ++i)
+        many.push_back({{"cell-type", 5U}, {"serving", i == 0}, {"earfcn", i}});
+    tellCells(many);
+    follow();
+    listen();
+    EXPECT_EQ(cells().asArray()->size(), 64U);
+}
+
+TEST_F(CellsTest, theServingCellsLevelsComeFromTheSignalWhereItHasNone) {
+    InterfaceMap modem = testModem(umtsAccess);
+    modem[Mock::signal] = {{"Rate", 5U}, {"Umts", QVariantMap{{"rscp", -88.6}, {"ecio", -9.0}}}};
+    mock.put(Mock::modemPath(0), modem);
+    tellCells({{{"cell-type", 3U}, {"serving", true}, {"psc", 7U}, {"ecio", -3.0}},
+               {{"cell-type", 3U}, {"serving", false}, {"psc", 8U}}});
+    follow();
+    listen();
+    constexpr auto kind = kVoxCellMonitorRadioAccessTechnologyUMTS;
+    EXPECT_EQ(
+        cells(),
+        array({cell(kind, kVoxCellMonitorCellTypeServing,
+                    {{"kVoxCellMonitorSCN", 7}, {"kVoxCellMonitorECN0", -3}, {"kVoxCellMonitorRSCP", -89}}),
+               cell(kind, kVoxCellMonitorCellTypeNeighbor, {{"kVoxCellMonitorSCN", 8}})}));
+}
+
+/// A place in the network and what it comes to on an access technology; none where it comes to nothing.
+struct Place {
+    const char* name;
+    uint access;
+    const char* location;
+    Value cell;
+};
+
+class PlaceTest : public CellsTest, public ::testing::WithParamInterface<Place> {};
+
+TEST_P(PlaceTest, standsInForCellInformation) {
+    InterfaceMap modem = testModem(GetParam().access);
+    modem[Mock::location] = {{"Capabilities", 1U}, {"Enabled", 1U}};
+    mock.put(Mock::modemPath(0), modem);
+    mock.answers["GetCellInfo"] = {
+        {}, "org.freedesktop.ModemManager1.Error.Core.Unsupported", "operation not supported"};
+    mock.answers["GetLocation"] = {
+        {QVariant::fromValue(LocationMap{{1U, QDBusVariant(QString(GetParam().location))}})}, {}, {}};
+    follow();
+    listen();
+    if (GetParam().cell.isNone()) {
+        ASSERT_TRUE(passes([this] { return mock.count("GetLocation") >= 2; }));
+        EXPECT_EQ(count(cellCode), 0U);
+    } else {
+        EXPECT_EQ(cells(), array({GetParam().cell}));
+    }
+    EXPECT_THAT(warnings(),
+                ElementsAre("modemmanager: modem 0 does not support cell information "
+                            "(org.freedesktop.ModemManager1.Error.Core.Unsupported: operation not "
+                            "supported)"));
+}
+
+Value servingPlace(std::string_view technology, std::initializer_list<Dictionary::Entry> members) {
+    return cell(technology, kVoxCellMonitorCellTypeServing, members);
+}
+
+INSTANTIATE_TEST_SUITE_P(
+    All, PlaceTest,
+    ::testing::Values(
+        Place{"lte", lteAccess, "001,01,0000,01A2D003,001005",
+              servingPlace(kVoxCellMonitorRadioAccessTechnologyLTE, {{"kVoxCellMonitorMCC", 1},
+                                                                     {"kVoxCellMonitorMNC", 1},
+                                                                     {"kVoxCellMonitorTAC", 4101},
+                                                                     {"kVoxCellMonitorCellId", 27447299}})},
+        Place{"lteWith5G", lteAccess | nrAccess, "001,01,FFFE,1,7",
+              servingPlace(kVoxCellMonitorRadioAccessTechnologyLTE, {{"kVoxCellMonitorMCC", 1},
+                                                                     {"kVoxCellMonitorMNC", 1},
+                                                                     {"kVoxCellMonitorTAC", 7},
+                                                                     {"kVoxCellMonitorCellId", 1}})},
+        Place{"gsm", gsmAccess, "310,260,8BE3,2BAF,0",
+              servingPlace(kVoxCellMonitorRadioAccessTechnologyGSM, {{"kVoxCellMonitorMCC", 310},
+                                                                     {"kVoxCellMonitorMNC", 260},
+                                                                     {"kVoxCellMonitorLAC", 35811},
+                                                                     {"kVoxCellMonitorCellId", 11183}})},
+        Place{"umtsOfFourParts", umtsAccess, "250,40,CE00,CEAD8F0",
+              servingPlace(kVoxCellMonitorRadioAccessTechnologyUMTS, {{"kVoxCellMonitorMCC", 250},
+                                                                      {"kVoxCellMonitorMNC", 40},
+                                                                      {"kVoxCellMonitorLAC", 52736},
+                                                                      {"kVoxCellMonitorCellId", 216717552}})},
+        Place{"nrAlone", nrAccess, "001,01,0000,1,7", {}}, Place{"onNoNetwork", 0, "001,01,0000,1,7", {}},
+        Place{"withoutCell", gsmAccess, "001,01,1000", {}}, Place{"empty", gsmAccess, "", {}},
+        Place{"tooManyParts", gsmAccess, "001,01,1000,1,1,1", {}},
+        Place{"cellTooLarge", gsmAccess, "001,01,1000,10000000,1", {}},
+        Place{"noHexadecimal", gsmAccess, "001,01,1000,xyz,1", {}}),
+    [](const auto& test) { return std::string(test.param.name); });
+
+} // namespace
+} // namespace velmora

@@ -1,0 +1,71 @@
+#include "Tests/Telephony/ModemManager/ModemManagerProcesses.h"
+
+#include <algorithm>
+#include <cstdlib>
+#include <string_view>
+#include <utility>
+
+namespace velmora {
+namespace {
+
+/// Without colours, and with one blank in place of several.
+std::string squeezed(std::string_view text) {
+    std::string result;
+    for (std::size_t i = 0; i < text.size(); ++i) {
+        if (text[i] == '\x1b')
+            i = std::min(text.find('m', i), text.size());
+        else if (text[i] != ' ' || !result.ends_with(' '))
+            result += text[i];
+    }
+    return result;
+}
+
+} // namespace
+
+ModemManagerProcesses::ModemManagerProcesses(const std::string& rules) : bus(rules) {
+    for (const char* name : {"DBUS_SYSTEM_BUS_ADDRESS", "DBUS_SESSION_BUS_ADDRESS"})
+        ::setenv(name, bus.address().c_str(), 1);
+}
+
+ModemManagerProcesses::~ModemManagerProcesses() {
+    for (const char* name : {"DBUS_SYSTEM_BUS_ADDRESS", "DBUS_SESSION_BUS_ADDRESS"})
+        ::unsetenv(name);
+}
+
+std::unique_ptr<TestProcess> ModemManagerProcesses::start(const std::string& program,
+                                                          std::vector<std::string> arguments) const {
+    return std::make_unique<TestProcess>(program, std::move(arguments), directory.path());
+}
+
+void ModemManagerProcesses::serve(const std::string& source, const std::string& line) {
+    service = start(VELMORA_BUILD_DIR "/velmora-telephonyd", {"--source", source});
+    ASSERT_TRUE(eventually([&] { return service->standardError().find(line + '\n') != std::string::npos; }))
+        << service->standardError();
+}
+
+std::unique_ptr<TestProcess> ModemManagerProcesses::watch() const {
+    return start(VELMORA_BUILD_DIR "/velmora-log", {"watch"});
+}
+
+std::string ModemManagerProcesses::shown(const TestProcess& watcher, const std::vector<std::string>& texts) {
+    std::string refresh;
+    const bool there = eventually([&] {
+        // Refreshes are written whole.
+        const std::string output = watcher.standardOutput();
+        refresh =
+            squeezed(std::string_view(output).substr(std::min(output.size(), output.rfind("Updated "))));
+        return std::all_of(texts.begin(), texts.end(), [&refresh](const std::string& text) {
+            return refresh.find(text) != std::string::npos;
+        });
+    });
+    return there ? refresh : std::string();
+}
+
+std::string ModemManagerProcesses::mmcli(std::vector<std::string> arguments) const {
+    arguments.insert(arguments.begin(), "--timeout=30");
+    const auto client = start("/usr/bin/mmcli", std::move(arguments));
+    static_cast<void>(client->exitStatus());
+    return squeezed(client->standardOutput() + client->standardError());
+}
+
+} // namespace velmora

@@ -1,0 +1,308 @@
+#include "LogGenerator/LogGenerator.h"
+#include "Platform/PropertyList.h"
+#include "Platform/Resources.h"
+#include "Platform/TelephonyService.h"
+#include "Recording/DLFReader.h"
+#include "Recording/DLFWriter.h"
+#include "Recording/DataSource.h"
+#include "Recording/OpenMessages.h"
+#include "Recording/RecordHeader.h"
+#include "Recording/RecordingWriter.h"
+#include "Telephony/ScenarioRegistry.h"
+#include "Telephony/SourceFactory.h"
+#include "Tests/Support/CapturedLog.h"
+#include "Tests/Support/FakeClock.h"
+#include "Tests/Support/FakeMainQueue.h"
+#include "Tests/Support/FakeResources.h"
+#include "Tests/Support/Hex.h"
+#include "Tests/Support/ShippedResources.h"
+#include "Tests/Support/TemporaryDirectory.h"
+#include "Tests/Telephony/ScenarioTesting.h"
+#include "Tests/Telephony/TelephonyTesting.h"
+
+#include <gmock/gmock.h>
+#include <gtest/gtest.h>
+
+#include <algorithm>
+#include <fstream>
+#include <memory>
+#include <optional>
+#include <string>
+#include <vector>
+
+// What every technology's drive leaves behind in each of the three forms, and what comes of playing that.
+
+namespace velmora {
+namespace {
+
+using namespace std::chrono_literals;
+
+std::string hexText(Bytes bytes) {
+    std::string text;
+    for (const std::uint8_t byte : bytes)
+        text += {"0123456789ABCDEF"[byte >> 4], "0123456789ABCDEF"[byte & 0xF]};
+    return text;
+}
+
+/// A drive and the application that saw it: a refresh every 2 s that had messages.
+class ReplayFormsTest : public ::testing::TestWithParam<std::string> {
+protected:
+    struct Refresh {
+        Time time;
+        std::vector<Data> messages;
+        Value display;
+    };
+
+    ReplayFormsTest() {
+        for (const char* name : {"LTE", "Ostrel_GSM", "Ostrel_UTRAN", "C2KTemplate"}) {
+            const auto root = readPropertyList(shippedResource(std::string(name) + ".plist").bytes());
+            resources.put(name, "plist", *root);
+        }
+        const auto scenario = scenarioKindNamed(GetParam())->make(1);
+        technology = shortTechnologyName(scenario->technology());
+        drive = driveOf(*scenario, 61s);
+    }
+
+    [[nodiscard]] std::unique_ptr<LogGenerator> decoder(const Clock& itsClock) const {
+        return LogGenerator::generatorFromTechnology(technologyConstant(technology), itsClock);
+    }
+
+    /// Runs the drive through the application's decoder.
+    void see() {
+        FakeClock seen;
+        const auto decodes = decoder(seen);
+        std::vector<Data> messages;
+        Time tick = seen.now() + 2s;
+        const auto refresh = [&] {
+            seen.setNow(tick);
+            const Value display = decodes->generateLogUsingState(state);
+            refreshes.push_back({tick, std::exchange(messages, {}), display.copy()});
+        };
+        for (const ScenarioEvent& event : drive) {
+            for (; FakeClock::defaultNow() + event.offset >= tick; tick += 2s)
+                if (!messages.empty())
+                    refresh();
+            decodes->updateState(state, event.message);
+            messages.push_back(event.message);
+        }
+        refresh();
+        saveContents = decodes->getSaveContentsFromState(state);
+    }
+
+    [[nodiscard]] std::string snapshot() const {
+        const DictionaryRef root = makeDictionary();
+        root->set("Timestamp", "2026-11-16 05:02:00 +0000");
+        root->set("Data", saveContents);
+        root->set("Description", "a drive");
+        std::string path = (directory / "drive.velmora").string();
+        std::ofstream(path) << *writeXMLPropertyList(root);
+        return path;
+    }
+
+    /// What the raw material of a display keeps of a message that came: none where that cannot be told apart
+    /// from what follows it.
+    [[nodiscard]] std::optional<Data> kept(const Data& message) const {
+        const auto header = recordHeader(message.bytes());
+        if (technology == "IFX")
+            return message;
+        if (!header)
+            return std::nullopt;
+        if (technology != "Ostrel_CDMA")
+            return message;
+        // Its decoder keeps what it has a parser for, less prefix.
+        constexpr std::uint32_t parsed[] = {0x108A, 0x1183, 0x1192, 0x12B6, 0x119C, 0x119D, 0x127E, 0x134F};
+        if (std::find(std::begin(parsed), std::end(parsed), header->logCode()) == std::end(parsed))
+            return std::nullopt;
+        return header->prefixed ? message.from(2) : message;
+    }
+
+    /// The messages that come out of the service.
+    [[nodiscard]] std::vector<Data> replayed(const std::string& path) {
+        const auto source = makeSource(ReplayChoice{path, 0, false, {}}, queue, clock);
+        if (!source)
+            throw std::runtime_error(source.reason());
+        EXPECT_EQ((*source)->technology(), technologyConstant(technology));
+        CollectingSink sink;
+        (*source)->start(sink);
+        while (!log.contains(LogPriority::Notice, path + ": played to the end, " +
+                                                      std::to_string(sink.messages.size()) + " messages"))
+            queue.advance(1ms);
+        return sink.messages;
+    }
+
+    /// What the decoder shows of the messages in the end.
+    [[nodiscard]] Value displayOf(const std::vector<Data>& messages) const {
+        const auto decodes = decoder(clock);
+        Dictionary shown;
+        for (const Data& message : messages)
+            decodes->updateState(shown, message);
+        return shown["Display"].copy();
+    }
+
+    FakeClock clock;
+    FakeMainQueue queue{clock};
+    CapturedLog log;
+    FakeResources resources;
+    TemporaryDirectory directory;
+    std::string technology;
+    Drive drive;
+    Dictionary state;
+    std::vector<Refresh> refreshes;
+    ArrayRef saveContents;
+};
+
+TEST_P(ReplayFormsTest, recording) {
+    const std::string path = (directory / "drive.pcapng").string();
+    const auto writer = RecordingWriter::create(path, technology);
+    ASSERT_TRUE(writer);
+    std::vector<Data> messages;
+    for (const ScenarioEvent& event : drive) {
+        messages.push_back(event.message);
+        ASSERT_TRUE((*writer)->append(FakeClock::defaultNow() + event.offset, event.message.bytes()));
+    }
+    ASSERT_TRUE((*writer)->close());
+    const std::vector<Data> again = replayed(path);
+    EXPECT_EQ(again, messages);
+    EXPECT_EQ(displayOf(again), displayOf(messages));
+}
+
+TEST_P(ReplayFormsTest, dlfLog) {
+    if (technology == "IFX")
+        GTEST_SKIP() << "its messages are no records";
+    const std::string path = (directory / "drive.dlf").string();
+    const auto writer = DLFWriter::create(path, clock);
+    ASSERT_TRUE(writer) << writer.reason();
+    std::vector<Data> messages;
+    for (const ScenarioEvent& event : drive) {
+        // Only those that were cut short do not fit.
+        EXPECT_EQ(static_cast<bool>((*writer)->append(event.message.bytes())), event.message.size() >= 13);
+        if (event.message.size() >= 13)
+            messages.push_back(event.message);
+    }
+    EXPECT_EQ((*writer)->refused(), drive.size() - messages.size());
+    EXPECT_EQ((*writer)->messages(), messages.size());
+    ASSERT_TRUE((*writer)->close());
+
+    const std::vector<Data> again = replayed(path);
+    EXPECT_EQ(again, messages);
+    EXPECT_EQ(displayOf(again), displayOf(messages));
+    EXPECT_THAT(log.textsAt(LogPriority::Warning), Not(testing::Contains(testing::HasSubstr("left out"))));
+
+    auto reader = openMessages(path);
+    ASSERT_TRUE(reader);
+    EXPECT_EQ((*reader)->form(), "DLF log");
+    for (const ScenarioEvent& event : drive) {
+        if (event.message.size() < 13)
+            continue;
+        const auto message = (*reader)->next();
+        ASSERT_TRUE(message);
+        EXPECT_EQ(message->message, event.message);
+    }
+    EXPECT_FALSE((*reader)->next());
+    EXPECT_EQ((*reader)->lossTotals().losses, 0u);
+}
+
+TEST_P(ReplayFormsTest, snapshot) {
+    see();
+    ASSERT_GT(refreshes.size(), 5u);
+    const std::vector<Refresh> lastFive(refreshes.end() - 5, refreshes.end());
+    auto reader = openMessages(snapshot());
+    ASSERT_TRUE(reader) << reader.reason();
+    EXPECT_EQ((*reader)->form(), "snapshot");
+    EXPECT_EQ((*reader)->technology(), technology);
+
+    // Refresh for refresh the messages that it had, and the date that it was given.
+    std::vector<Data> all;
+    for (const Refresh& refresh : lastFive) {
+        std::vector<Data> wanted;
+        for (const Data& message : refresh.messages)
+            if (const auto rest = kept(message))
+                wanted.push_back(*rest);
+        std::vector<Data> got;
+        std::optional<Time> date;
+        while (!date) {
+            const auto message = (*reader)->next();
+            ASSERT_TRUE(message);
+            EXPECT_GE(message->time, refresh.time - 2s);
+            EXPECT_LT(message->time, refresh.time);
+            got.push_back(message->message);
+            date = message->refresh;
+        }
+        EXPECT_EQ(date, refresh.time);
+        if (technology == "IFX") {
+            // The object of the last message, written anew.
+            ASSERT_EQ(got.size(), 1u);
+            EXPECT_EQ(*readPropertyList(got[0].bytes()), *readPropertyList(wanted.back().bytes()));
+            EXPECT_EQ(displayOf(got), refresh.display);
+        } else {
+            EXPECT_EQ(got, wanted);
+        }
+        all.insert(all.end(), got.begin(), got.end());
+    }
+    EXPECT_FALSE((*reader)->next());
+    EXPECT_EQ(replayed(snapshot()), all);
+}
+
+/// The application's own DLF log, whose buffers keep all type bytes but their first.
+TEST_P(ReplayFormsTest, dlfLogOfASnapshot) {
+    see();
+    const Value& item = (*saveContents)[saveContents->size() - 1];
+    const Data* const dlf = (*item.asDictionary())["DLF"].asData();
+    if (technology == "IFX") {
+        EXPECT_EQ(dlf, nullptr);
+        return;
+    }
+    ASSERT_NE(dlf, nullptr);
+    const std::string path = (directory / "drive.dlf").string();
+    std::ofstream(path, std::ios::binary)
+        .write(reinterpret_cast<const char*>(dlf->bytes().data()), static_cast<std::streamsize>(dlf->size()));
+    std::vector<Data> wanted;
+    for (auto refresh = refreshes.end() - 5; refresh != refreshes.end(); ++refresh)
+        for (const Data& message : refresh->messages)
+            if (const auto rest = kept(message))
+                wanted.push_back(*rest);
+    EXPECT_EQ(replayed(path), wanted);
+}
+
+/// Every buffer of a long drive as the application's log has it: less its first byte, with all that is odd
+/// about the drive's messages.
+TEST_P(ReplayFormsTest, dlfLogOfManyBuffers) {
+    if (technology == "IFX")
+        GTEST_SKIP() << "its messages are no records";
+    std::vector<std::uint8_t> dlf;
+    std::vector<Data> wanted;
+    std::uint64_t lost = 0;
+    const auto scenario = scenarioKindNamed(GetParam())->make(2);
+    std::int64_t buffer = -1;
+    for (const ScenarioEvent& event : driveOf(*scenario, 20min)) {
+        const bool isFirst = std::exchange(buffer, event.offset / 2s) != buffer;
+        const Bytes bytes = event.message.bytes().subspan(isFirst ? 1 : 0);
+        dlf.insert(dlf.end(), bytes.begin(), bytes.end());
+        if (event.message.size() < RecordHeader::size) {
+            lost += bytes.size();
+            continue;
+        }
+        wanted.push_back(event.message);
+        // A first message's wrong type byte is gone for good.
+        if (isFirst && event.message.bytes()[0] == 2)
+            wanted.back() = joined(hex("01"), event.message.from(1));
+    }
+    auto reader = DLFReader::open(ChunkedInput(std::make_unique<DataSource>(Data(std::move(dlf)))));
+    ASSERT_TRUE(reader) << reader.reason();
+    EXPECT_EQ((*reader)->technology(), technology);
+    for (std::size_t i = 0; i < wanted.size(); ++i) {
+        const auto message = (*reader)->next();
+        ASSERT_TRUE(message);
+        ASSERT_EQ(hexText(message->message.bytes()), hexText(wanted[i].bytes()))
+            << i << " at " << message->offset;
+    }
+    EXPECT_FALSE((*reader)->next());
+    EXPECT_EQ((*reader)->lossTotals().bytes, lost);
+    EXPECT_GT(lost, 0u);
+}
+
+INSTANTIATE_TEST_SUITE_P(OfEachTechnology, ReplayFormsTest,
+                         ::testing::Values("gsm", "lte", "utran", "c2k", "ifx"));
+
+} // namespace
+} // namespace velmora
