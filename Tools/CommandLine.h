@@ -2,6 +2,7 @@
 
 #include "Platform/Linux/ProgramLog.h"
 #include "Platform/SystemLog.h"
+#include "Tools/ConvertCommand.h"
 #include "Tools/DecodeCommand.h"
 #include "Tools/InfoCommand.h"
 #include "Tools/RecordCommand.h"
@@ -22,7 +23,7 @@ struct CommandLine {
 
     LogKind log = LogKind::Stderr;
     int logLevel = LogPriority::Error;
-    std::variant<Words, DecodeOptions, WatchOptions, RecordOptions, InfoOptions> command;
+    std::variant<Words, DecodeOptions, WatchOptions, RecordOptions, ConvertOptions, InfoOptions> command;
 };
 
 /// Reads the arguments, the program's name first. Never ends the program.

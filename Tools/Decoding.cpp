@@ -1,6 +1,8 @@
 #include "Tools/Decoding.h"
 
 #include "Platform/TelephonyService.h"
+#include "Tools/DecodeProgress.h"
+#include "Tools/NotedResources.h"
 #include "Tools/RecordedTime.h"
 #include "Tools/Report.h"
 #include "Tools/Technologies.h"
@@ -10,36 +12,60 @@
 
 namespace velmora {
 
-Result<Decoded> decodeMessages(MessageReader& reader, const std::string& technology, WorkContext& context,
-                               const RefreshAction& refreshed) {
+Result<Decoded> decodeMessages(MessageReader& reader, const DecodingRequest& request, WorkContext& context,
+                               DecodingObserver& observer) {
     // The first message before the technology: a file may name it no earlier than there.
     std::optional<LoggedMessage> message = reader.next();
-    const std::string& named = technology.empty() ? reader.technology() : technology;
+    const std::string& named = request.technology.empty() ? reader.technology() : request.technology;
     RecordedClock clock;
     const Result<std::unique_ptr<LogGenerator>> decoder = makeDecoder(named, clock);
     if (!decoder)
         return Failure{decoder.reason() + (named.empty() ? "; --technology supplies it" : "")};
 
+    const NotedResources resources;
     Decoded decoded;
     decoded.technology = shortTechnologyName(named);
     Dictionary state;
     RecordedTicks ticks;
+    bool fileTellsRefreshes = false; // instead of the ticks
+    bool isRefreshed = true;         // since the latest wanted message
     const auto refresh = [&](Time tick) {
+        isRefreshed = true;
         clock.setNow(tick);
         decoded.display = (*decoder)->generateLogUsingState(state);
-        if (refreshed)
-            refreshed(tick, decoded.display);
+        observer.refreshed(tick, decoded);
     };
-    for (; message; message = reader.next()) {
-        if (const std::optional<Time> tick = ticks.before(message->time))
+    MessageEffects* const effects = observer.effects();
+    const Time first = message ? message->time : Time();
+    for (; message && !observer.hasEnough(); message = reader.next()) {
+        if (request.progress)
+            request.progress->at(message->offset);
+        fileTellsRefreshes = fileTellsRefreshes || message->refresh;
+        if (!request.range.contains(message->time, first)) {
+            if (message->refresh && !isRefreshed)
+                refresh(*message->refresh);
+            continue;
+        }
+        if (const std::optional<Time> tick = ticks.before(message->time); tick && !fileTellsRefreshes)
             refresh(*tick);
         context.atRecord(message->number, message->offset);
         clock.setNow(message->time);
-        (*decoder)->updateState(state, message->message);
+        observer.messageComes(*message);
+        if (effects)
+            (*decoder)->updateStateTelling(state, message->message, *effects);
+        else
+            (*decoder)->updateState(state, message->message);
         ++decoded.messages;
+        isRefreshed = false;
+        observer.messageDecoded(*message, state["Display"]);
+        if (message->refresh)
+            refresh(*message->refresh);
     }
-    if (const std::optional<Time> tick = ticks.last())
+    if (const std::optional<Time> tick = ticks.last(); tick && !isRefreshed)
         refresh(*tick);
+    observer.ended(**decoder, state);
+    if (!resources.failure().empty())
+        return Failure{"decoded without its template: " + resources.failure()};
     return decoded;
 }
 

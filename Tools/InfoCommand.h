@@ -6,9 +6,10 @@ namespace velmora {
 
 class Output;
 
-/// `velmora-log info`: what a recording holds, and what is wrong with it.
+/// `velmora-log info`: what a file of log messages holds, and what is wrong with it.
 struct InfoOptions {
     std::string file;
+    std::string technology; ///< before the one that the file names; empty for that one
 };
 
 /// The exit status.

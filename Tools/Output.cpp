@@ -26,13 +26,23 @@ Output::~Output() {
 void Output::put(std::string_view text) {
     if (_state != State::Open)
         return;
-    _buffer += text;
-    if (_buffer.size() >= flushThreshold)
+    if (_buffer.size() + text.size() >= flushThreshold) {
         flush();
+        // What is large enough by itself goes without a copy.
+        if (text.size() >= flushThreshold) {
+            write(text);
+            return;
+        }
+    }
+    _buffer += text;
 }
 
 void Output::flush() {
-    std::string_view rest = _buffer;
+    write(_buffer);
+    _buffer.clear();
+}
+
+void Output::write(std::string_view rest) {
     while (!rest.empty() && _state == State::Open) {
         const ssize_t count = ::write(_descriptor, rest.data(), rest.size());
         if (count >= 0) {
@@ -48,7 +58,6 @@ void Output::flush() {
             report("cannot write " + _name + ": " + std::generic_category().message(error));
         }
     }
-    _buffer.clear();
 }
 
 bool Output::hasLostReader() const {

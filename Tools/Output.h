@@ -32,6 +32,8 @@ public:
     [[nodiscard]] bool hasLostReader() const;
 
 private:
+    void write(std::string_view rest);
+
     int _descriptor;
     std::string _name;
     std::string _buffer;

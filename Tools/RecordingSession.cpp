@@ -1,8 +1,11 @@
 #include "Tools/RecordingSession.h"
 
+#include "Platform/Linux/FileDraft.h"
 #include "Platform/TelephonyService.h"
+#include "Tools/Report.h"
 
 #include <cerrno>
+#include <filesystem>
 #include <system_error>
 #include <utility>
 
@@ -22,6 +25,11 @@ bool isRegularFile(int descriptor) {
     return ::fstat(descriptor, &status) == 0 && S_ISREG(status.st_mode);
 }
 
+bool isFilledFile(int descriptor) {
+    struct stat status = {};
+    return ::fstat(descriptor, &status) == 0 && S_ISREG(status.st_mode) && status.st_size > 0;
+}
+
 } // namespace
 
 Result<std::unique_ptr<RecordingSession>> RecordingSession::open(const std::string& path, bool force) {
@@ -34,7 +42,7 @@ Result<std::unique_ptr<RecordingSession>> RecordingSession::open(const std::stri
     if (!session->_created && errno == EEXIST) {
         session->_file = FileDescriptor(::open(path.c_str(), O_WRONLY | O_CLOEXEC));
         if (session->_file.get() >= 0 && isRegularFile(session->_file.get()) && !force)
-            return Failure{path + " is there already; --force overwrites it"};
+            return Failure{alreadyThere(path)};
     }
     if (session->_file.get() < 0)
         return Failure{"cannot create " + path + ": " + std::generic_category().message(errno)};
@@ -42,7 +50,13 @@ Result<std::unique_ptr<RecordingSession>> RecordingSession::open(const std::stri
 }
 
 RecordingSession::~RecordingSession() {
-    if (!_writer && _created)
+    _writer.reset();
+    removeIfEmpty();
+}
+
+void RecordingSession::removeIfEmpty() const {
+    struct stat status = {};
+    if (_created && ::stat(_path.c_str(), &status) == 0 && S_ISREG(status.st_mode) && status.st_size == 0)
         ::unlink(_path.c_str());
 }
 
@@ -53,10 +67,21 @@ Result<Done> RecordingSession::learnTechnology(std::string_view technology) {
                        _technology};
     if (_writer)
         return Done{};
-    if (_path != "-" && isRegularFile(_file.get()) && ::ftruncate(_file.get(), 0) != 0)
-        return Failure{"cannot write " + _path + ": " + std::generic_category().message(errno)};
+    // A file that is to be overwritten stays as it is until the new one has its head.
+    std::optional<FileDraft> draft;
+    if (isFilledFile(_file.get())) {
+        std::error_code error;
+        std::filesystem::path place = std::filesystem::canonical(_path, error); // a symbolic link stays one
+        if (error)
+            place = _path;
+        Result<FileDraft> made = FileDraft::create(place, newFileMode);
+        if (!made)
+            return Failure{_path + ": " + made.reason()};
+        draft.emplace(*std::move(made));
+    }
     // The writer closes what it is given, and so gets a descriptor of its own.
-    const int copy = _path == "-" ? -1 : ::fcntl(_file.get(), F_DUPFD_CLOEXEC, 0);
+    const int descriptor = draft ? draft->descriptor() : _file.get();
+    const int copy = _path == "-" ? -1 : ::fcntl(descriptor, F_DUPFD_CLOEXEC, 0);
     if (_path != "-" && copy < 0)
         return Failure{"cannot write " + _path + ": " + std::generic_category().message(errno)};
     Result<std::unique_ptr<RecordingWriter>> writer =
@@ -64,24 +89,38 @@ Result<Done> RecordingSession::learnTechnology(std::string_view technology) {
     _file.reset();
     if (!writer)
         return Failure{writer.reason()};
+    if (draft) {
+        if (Result<Done> written = (*writer)->flush(); !written) // the head may be waiting
+            return written;
+        if (const Result<Done> published = draft->publish(FileDraft::WhereThereIsOne::Replace); !published)
+            return Failure{_path + ": " + published.reason()};
+    }
     _writer = *std::move(writer);
     _technology = name;
-    return Done{};
+    return unlessItMayPass(_writer->flush()); // the head may be waiting
 }
 
 Result<Done> RecordingSession::append(Time time, Bytes message) {
+    const std::uint64_t before = _writer->messages();
     Result<Done> appended = _writer->append(time, message);
-    if (appended) {
-        ++_messages;
+    if (_writer->messages() != before)
         _bytes += message.size();
-    }
-    return appended;
+    return unlessItMayPass(std::move(appended));
 }
 
-Result<Done> RecordingSession::flush() {
+Result<Done> RecordingSession::save() {
     if (!_writer)
         return Done{};
-    return _writer->flush();
+    return unlessItMayPass(_writer->sync());
+}
+
+Result<Done> RecordingSession::unlessItMayPass(Result<Done> result) {
+    const bool waiting = _writer->isWaiting();
+    if (!waiting)
+        _trouble.clear();
+    else if (!result)
+        _trouble = result.reason();
+    return waiting ? Result<Done>(Done{}) : std::move(result);
 }
 
 Result<Done> RecordingSession::close() {

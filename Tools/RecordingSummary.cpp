@@ -6,7 +6,6 @@
 #include <algorithm>
 #include <cinttypes>
 #include <cstdio>
-#include <vector>
 
 namespace velmora {
 
@@ -40,29 +39,15 @@ std::string durationText(Time first, Time last) {
     return text;
 }
 
-std::string sectionNames(const ClassIndex* index, std::uint32_t code) {
-    const std::vector<Base*>* sections = index ? index->getSubscribers(code) : nullptr;
-    std::vector<std::string_view> names;
-    if (sections)
-        for (const Base* section : *sections)
-            if (std::find(names.begin(), names.end(), section->getSectionName()) == names.end())
-                names.push_back(section->getSectionName());
-    std::string text;
-    for (const std::string_view name : names) {
-        text += text.empty() ? "" : ", ";
-        text += name;
-    }
-    return text.empty() ? "-" : text;
-}
-
-std::string codeTable(const RecordingSummary& summary, const ClassIndex* index) {
-    std::string text = "\n    code     messages  sections\n";
+std::string codeTable(const RecordingSummary& summary, const CodeNames& names) {
+    std::string text = std::string("\n    code     messages  ") + names.heading + "\n";
     for (const auto& [code, counted] : summary.codes()) {
         char line[64];
         std::snprintf(line, sizeof line, code > 0xFFFF ? "0x%06X" : "  0x%04X", static_cast<unsigned>(code));
         text += line;
         std::snprintf(line, sizeof line, " %12" PRIu64 "  ", counted.messages);
-        text += line + sectionNames(index, code) + "\n";
+        const std::string name = names.nameOf ? names.nameOf(code) : std::string();
+        text += line + (name.empty() ? "-" : name) + "\n";
     }
     return text;
 }
@@ -112,8 +97,9 @@ void RecordingSummary::add(const LoggedMessage& message) {
 }
 
 std::string summaryText(const RecordingSummary& summary, const std::string& technology,
-                        const ClassIndex* index, const MessageReader& reader) {
-    std::string text = "technology: " + (technology.empty() ? "not named" : printable(technology)) + "\n";
+                        const CodeNames& names, const MessageReader& reader) {
+    std::string text = "form:       " + std::string(reader.form()) + "\n";
+    text += "technology: " + (technology.empty() ? "not named" : printable(technology)) + "\n";
     if (summary.first()) {
         text += "first:      " + timeText(*summary.first()) + "\n";
         text += "last:       " + timeText(*summary.last()) + "\n";
@@ -128,7 +114,7 @@ std::string summaryText(const RecordingSummary& summary, const std::string& tech
     }
     text += lossLines(reader);
     if (!summary.codes().empty())
-        text += codeTable(summary, index);
+        text += codeTable(summary, names);
     return text;
 }
 

@@ -1,10 +1,10 @@
 #pragma once
 
-#include "LogGenerator/ClassIndex.h"
 #include "Platform/Clock.h"
 #include "Recording/MessageReader.h"
 
 #include <cstdint>
+#include <functional>
 #include <map>
 #include <optional>
 #include <string>
@@ -54,9 +54,15 @@ private:
     Count _prefixed;
 };
 
-/// The summary as `info` prints it. `index` names the sections that want a code; null where the technology's
-/// decoder has none.
+/// What the log codes of a technology are to those who decode them.
+struct CodeNames {
+    const char* heading = "sections";
+    /// Empty for a code that nobody wants. May be missing, where there is no decoder.
+    std::function<std::string(std::uint32_t code)> nameOf;
+};
+
+/// The summary as `info` prints it.
 [[nodiscard]] std::string summaryText(const RecordingSummary& summary, const std::string& technology,
-                                      const ClassIndex* index, const MessageReader& reader);
+                                      const CodeNames& names, const MessageReader& reader);
 
 } // namespace velmora

@@ -1,13 +1,13 @@
 #include "Tools/Report.h"
 
+#include "Platform/Linux/Termination.h"
 #include "Tools/ExitStatus.h"
 
-#include <cerrno>
+#include <cinttypes>
+#include <cstdio>
 #include <cstdlib>
 #include <exception>
 #include <utility>
-
-#include <unistd.h>
 
 namespace velmora {
 
@@ -15,6 +15,13 @@ namespace {
 
 // The terminate handler has no other way to find it.
 WorkContext* currentContext = nullptr;
+char lastWords[4096];
+
+/// No destructor runs: the program's objects are as the failure left them.
+[[noreturn]] void endSaying(const char* text) {
+    writeToStandardError(text);
+    std::_Exit(ExitStatus::BadInput);
+}
 
 } // namespace
 
@@ -22,18 +29,15 @@ void report(std::string_view text) {
     std::string line = "velmora-log: ";
     line += text;
     line += '\n';
-    std::string_view rest = line;
-    while (!rest.empty()) {
-        const auto written = ::write(STDERR_FILENO, rest.data(), rest.size());
-        if (written >= 0)
-            rest.remove_prefix(static_cast<std::size_t>(written));
-        else if (errno != EINTR)
-            return; // there is nowhere left to say so
-    }
+    writeToStandardError(line);
 }
 
 std::string fileTitle(const std::string& path) {
     return path == "-" ? "standard input" : path;
+}
+
+std::string alreadyThere(const std::string& path) {
+    return path + " is there already; --force overwrites it";
 }
 
 std::string placeInFile(std::string_view title, std::uint64_t number, std::uint64_t offset) {
@@ -55,27 +59,22 @@ void WorkContext::takeOverTermination() {
 }
 
 void WorkContext::terminate() noexcept {
+    // Nothing here asks for memory, since there may be none left.
+    const char* const reason = reasonOfTermination();
+    const WorkContext* const context = currentContext;
+    if (!context)
+        std::snprintf(lastWords, sizeof lastWords, "velmora-log: %s\n", reason);
+    else if (context->_number == 0)
+        std::snprintf(lastWords, sizeof lastWords, "velmora-log: %s: %s\n", context->_title.c_str(), reason);
+    else
+        std::snprintf(lastWords, sizeof lastWords,
+                      "velmora-log: %s: record %" PRIu64 " at offset %" PRIu64 ": %s\n",
+                      context->_title.c_str(), context->_number, context->_offset, reason);
     // A failure while cleaning up must not come back here.
-    std::set_terminate([] { std::_Exit(ExitStatus::BadInput); });
-    std::string reason = "unexpected end";
-    if (const std::exception_ptr exception = std::current_exception()) {
-        try {
-            std::rethrow_exception(exception);
-        } catch (const std::exception& error) {
-            reason = error.what();
-        } catch (...) {
-            reason = "unknown failure";
-        }
-    }
-    std::string place;
-    if (const WorkContext* context = currentContext) {
-        if (context->_cleanUp)
-            context->_cleanUp();
-        place = placeInFile(context->_title, context->_number, context->_offset) + ": ";
-    }
-    report(place + reason);
-    // No destructor runs: the program's objects are as the failure left them.
-    std::_Exit(ExitStatus::BadInput);
+    std::set_terminate([] { endSaying(lastWords); });
+    if (context && context->_cleanUp)
+        context->_cleanUp();
+    endSaying(lastWords);
 }
 
 } // namespace velmora

@@ -13,6 +13,9 @@ void report(std::string_view text);
 /// How messages call a file: "standard input" for "-".
 [[nodiscard]] std::string fileTitle(const std::string& path);
 
+/// What keeps a command from writing a file that is there.
+[[nodiscard]] std::string alreadyThere(const std::string& path);
+
 /// "TITLE: record N at offset O", or the title alone where there is no record (number 0).
 [[nodiscard]] std::string placeInFile(std::string_view title, std::uint64_t number, std::uint64_t offset);
 

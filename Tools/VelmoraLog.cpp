@@ -45,6 +45,7 @@ int runVelmoraLog(int count, const char* const* arguments) {
     // Standard output carries the result alone.
     redirectConsole(stderr);
     std::signal(SIGPIPE, SIG_IGN); // a closed pipe is told by the write that finds it
+    std::signal(SIGXFSZ, SIG_IGN); // and so is a limit on the file's size
     WorkContext::takeOverTermination();
 
     const CommandLine line = parseCommandLine(count, arguments);
@@ -64,6 +65,8 @@ int runVelmoraLog(int count, const char* const* arguments) {
         status = runRecord(*record);
     else if (const auto* info = std::get_if<InfoOptions>(&line.command))
         status = runInfo(*info, output);
+    else if (const auto* convert = std::get_if<ConvertOptions>(&line.command))
+        status = runConvert(*convert);
     setResources(nullptr);
     return status;
 }

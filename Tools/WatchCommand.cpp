@@ -8,8 +8,11 @@
 #include "Tools/WatchView.h"
 
 #include <chrono>
+#include <functional>
 #include <memory>
 #include <string>
+#include <string_view>
+#include <utility>
 
 namespace velmora {
 
@@ -21,12 +24,32 @@ using namespace std::chrono_literals;
 constexpr auto statusInterval = 250ms;
 constexpr const char* connecting = "Connecting...";
 
+/// A model that tells when it meets another technology than the one before. A model's display is that of the
+/// technology it met first, and stays so; what another one reports takes another model.
+class WatchModel final : public VelmoraModel {
+public:
+    WatchModel(ModelPlatform platform, ModelObserver* observer, std::function<void()> technologyChanged)
+        : VelmoraModel(std::move(platform), observer), _technologyChanged(std::move(technologyChanged)) {}
+
+protected:
+    [[nodiscard]] std::unique_ptr<LogGenerator>
+    generatorFromTechnology(std::string_view technology) override {
+        if (!_technology.empty() && _technology != technology)
+            _technologyChanged();
+        _technology = technology;
+        return VelmoraModel::generatorFromTechnology(technology);
+    }
+
+private:
+    std::function<void()> _technologyChanged;
+    std::string _technology;
+};
+
 /// The model's observer: hands each refresh to the view, and keeps the status line true in between.
 class Watcher final : public ModelObserver {
 public:
     Watcher(const WatchOptions& options, Output& output, ServiceClient& client)
-        : _client(client), _once(options.once),
-          _model(std::make_shared<VelmoraModel>(client.platform(), this)) {
+        : _client(client), _once(options.once), _model(newModel()) {
         if (!_once && Terminal::isThere())
             _view = std::make_unique<ScreenView>([this] { _client.loop.quit(ExitStatus::Done); });
         else
@@ -40,7 +63,7 @@ public:
             _view->leave();
         });
         const SignalWatcher signals([this](int) { _client.loop.quit(ExitStatus::Done); });
-        _client.queue.async([model = _model] { model->restartMonitor(); });
+        _client.queue.async([this] { _model->restartMonitor(); });
         // The first look comes after the first attempt to connect.
         _client.queue.async([this] { lookAround(); });
         _statusTimer = _client.queue.repeating(statusInterval, [this] { lookAround(); });
@@ -61,6 +84,17 @@ public:
     }
 
 private:
+    [[nodiscard]] std::shared_ptr<VelmoraModel> newModel() {
+        return std::make_shared<WatchModel>(_client.platform(), this,
+                                            [this] { _client.queue.async([this] { beginAnew(); }); });
+    }
+
+    void beginAnew() {
+        _model->destroyPorts();
+        _model = newModel();
+        _model->restartMonitor();
+    }
+
     [[nodiscard]] std::string status() const { return _model->isConnected() ? _updateMessage : connecting; }
 
     void lookAround() {

@@ -26,6 +26,29 @@ TEST(CommandLineTest, DecodeTakesFilesFormatAndTechnology) {
     EXPECT_EQ(decode->technology, "IFX");
 }
 
+TEST(CommandLineTest, DecodeTakesWhatLinesAndPartsAreWanted) {
+    const CommandLine line =
+        parse({"decode", "--select", "/A/B", "--format", "csv", "--every", "message", "a", "--select=/C",
+               "--jobs", "3", "--from", "+1.5", "--to", "1970-01-01T00:01:00Z", "b"});
+    const auto* decode = std::get_if<DecodeOptions>(&line.command);
+    ASSERT_NE(decode, nullptr);
+    EXPECT_THAT(decode->files, ElementsAre("a", "b"));
+    EXPECT_THAT(decode->selection.paths(), ElementsAre("/A/B", "/C"));
+    EXPECT_EQ(decode->format, DecodeOptions::Format::Csv);
+    EXPECT_EQ(decode->every, DecodeOptions::Every::Message);
+    EXPECT_EQ(decode->jobs, 3U);
+    EXPECT_EQ(decode->range.from, (TimeBound{std::chrono::milliseconds(1500), true}));
+    EXPECT_EQ(decode->range.to, (TimeBound{std::chrono::minutes(1), false}));
+    const CommandLine lines = parse({"decode", "--format", "jsonl", "a"});
+    const auto* plain = std::get_if<DecodeOptions>(&lines.command);
+    ASSERT_NE(plain, nullptr);
+    EXPECT_EQ(plain->format, DecodeOptions::Format::JsonLines);
+    EXPECT_EQ(plain->every, DecodeOptions::Every::Refresh);
+    EXPECT_THAT(plain->selection.paths(), testing::IsEmpty());
+    EXPECT_EQ(plain->jobs, 1U);
+    EXPECT_FALSE(plain->range.from || plain->range.to);
+}
+
 TEST(CommandLineTest, WithoutOptionsLogLinesOfErrorsGoToStandardError) {
     const CommandLine line = parse({"decode", "a"});
     const auto* decode = std::get_if<DecodeOptions>(&line.command);
@@ -60,20 +83,64 @@ TEST(CommandLineTest, RecordTakesItsLimits) {
     EXPECT_EQ(record->count, 20U);
 }
 
+TEST(CommandLineTest, ConvertTakesWhatTheNewFileIsToBe) {
+    const CommandLine line =
+        parse({"convert", "-", "a.velmora", "--force", "--technology", "IFX", "--description", "gate 4"});
+    const auto* convert = std::get_if<ConvertOptions>(&line.command);
+    ASSERT_NE(convert, nullptr);
+    EXPECT_EQ(convert->file, "-");
+    EXPECT_EQ(convert->out, "a.velmora");
+    EXPECT_TRUE(convert->force);
+    EXPECT_EQ(convert->technology, "IFX");
+    EXPECT_EQ(convert->description, "gate 4");
+    const CommandLine plainLine = parse({"convert", "a.dlf", "a.pcapng"});
+    const auto* plain = std::get_if<ConvertOptions>(&plainLine.command);
+    ASSERT_NE(plain, nullptr);
+    EXPECT_FALSE(plain->force);
+    EXPECT_EQ(plain->technology, "");
+    EXPECT_EQ(plain->description, "");
+}
+
+TEST(CommandLineTest, InfoTakesAFileAndATechnology) {
+    const CommandLine line = parse({"info", "a.dlf", "--technology", "Ostrel_LTE"});
+    const auto* info = std::get_if<InfoOptions>(&line.command);
+    ASSERT_NE(info, nullptr);
+    EXPECT_EQ(info->file, "a.dlf");
+    EXPECT_EQ(info->technology, "Ostrel_LTE");
+}
+
 TEST(CommandLineTest, UsageErrorsSayWhatWasGivenAndWhatIsWanted) {
     struct Case {
         std::vector<const char*> arguments;
         const char* message;
     };
     const Case cases[] = {
-        {{}, "no command, wanted decode, watch, record or info"},
-        {{"bogus"}, "got bogus, wanted one of the commands decode, watch, record and info"},
+        {{}, "no command, wanted decode, watch, record, convert or info"},
+        {{"bogus"}, "got bogus, wanted one of the commands decode, watch, record, convert and info"},
         {{"decode"}, "FILE is required"},
-        {{"decode", "--format", "xml", "a"}, "--format: got xml, wanted text or json"},
+        {{"decode", "--format", "xml", "a"}, "--format: got xml, wanted text or json or jsonl or csv"},
+        {{"decode", "--every", "day", "a"}, "--every: got day, wanted refresh or message"},
+        {{"decode", "--select", "GSM", "a"}, "--select: got GSM, wanted a path that begins with a slash"},
+        {{"decode", "--jobs", "0", "a"}, "--jobs: got 0, wanted a number above 0"},
+        {{"decode", "--from", "noon", "a"},
+         "--from: got noon, wanted a time such as 2026-11-16T05:00:00Z, seconds since 1970, or +SECONDS "
+         "after the first message"},
+        {{"decode", "--to", "-1", "a"},
+         "--to: got -1, wanted a time such as 2026-11-16T05:00:00Z, seconds since 1970, or +SECONDS after "
+         "the first message"},
+        {{"decode", "--format", "csv", "a"}, "--format csv: got no --select, wanted one for each column"},
+        {{"decode", "--every", "message", "a"},
+         "--every message: got another format, wanted --format jsonl or csv"},
+        {{"decode", "--every", "message", "--format", "json", "a"},
+         "--every message: got another format, wanted --format jsonl or csv"},
+        {{"decode", "--every", "message", "--format", "jsonl", "--select", "/A", "a"},
+         "--every message: got --select with --format jsonl, wanted it with --format csv or not at all"},
         {{"decode", "--bogus", "a"}, "The following argument was not expected: --bogus"},
         {{"record", "a", "--count", "0"}, "--count: got 0, wanted a number above 0"},
         {{"record", "a", "--duration", "0"}, "--duration: got 0, wanted seconds from 0.001 to 2000000"},
         {{"record", "a", "--duration", "1e99"}, "--duration: got 1e99, wanted seconds from 0.001 to 2000000"},
+        {{"convert", "a"}, "OUT is required"},
+        {{"convert", "a", "-"}, "OUT: got -, wanted a name that ends in .pcapng, .velmora or .dlf"},
         {{"info", "a", "b"}, "The following argument was not expected: b"},
         {{"watch", "--log-level", "8"}, "--log-level: got 8, wanted a number from 0 to 7"},
         {{"--log", "file", "watch"}, "--log: got file, wanted syslog or stderr"},
@@ -96,6 +163,7 @@ TEST_F(CommandLineProgramTest, EveryHelpTextShowsAnExampleOnStandardOutput) {
         {{"decode", "--help"}, "\n  velmora-log decode drive.pcapng\n"},
         {{"watch", "--help"}, "\n  velmora-log watch\n"},
         {{"record", "--help"}, "\n  velmora-log record drive.pcapng\n"},
+        {{"convert", "--help"}, "\n  velmora-log record - | velmora-log convert - drive.dlf\n"},
         {{"info", "--help"}, "\n  velmora-log info drive.pcapng\n"},
     };
     for (const auto& [arguments, example] : cases) {

@@ -183,7 +183,20 @@ TEST_F(DecodeCommandTest, FileThatIsNoRecordingIsRefused) {
     EXPECT_EQ(process.exitStatus(), 1);
     EXPECT_EQ(process.output(), "");
     EXPECT_EQ(ownWords(process.errors()),
-              "velmora-log: standard input: empty, wanted a pcapng section header\n");
+              "velmora-log: standard input: empty, wanted a recording, a snapshot or a DLF log\n");
+}
+
+TEST_F(DecodeCommandTest, TemplateThatCannotBeReadIsTold) {
+    writeDrive("drive.pcapng");
+    const std::string place = path("resources/Ostrel_GSM.plist");
+    std::filesystem::remove(place);
+    std::filesystem::create_directory(place);
+    ToolProcess process(tool({"decode", path("drive.pcapng")}));
+    EXPECT_EQ(process.exitStatus(), 1);
+    EXPECT_EQ(process.output(), "");
+    EXPECT_EQ(ownWords(process.errors()), "velmora-log: " + path("drive.pcapng") +
+                                              ": decoded without its template: " + place +
+                                              ": cannot be read: Is a directory\n");
 }
 
 TEST_F(DecodeCommandTest, RecordingCutOffIsDecodedUpToThere) {

@@ -4,6 +4,7 @@
 #include "Platform/TelephonyService.h"
 #include "Tests/Tools/ToolFixture.h"
 
+#include <algorithm>
 #include <stdexcept>
 #include <utility>
 
@@ -47,6 +48,11 @@ FakeLogService::~FakeLogService() {
 void FakeLogService::send(const Data& message) {
     for (const auto& client : _clients)
         client->post(0, message);
+}
+
+bool FakeLogService::isAllTaken() const {
+    return std::all_of(_clients.begin(), _clients.end(),
+                       [](const auto& client) { return client->waitingMessages() == 0; });
 }
 
 std::optional<Data> FakeLogService::createChannel(const Data& request) {

@@ -22,6 +22,8 @@ public:
     /// Clients that have sent their start command.
     [[nodiscard]] std::size_t streaming() const { return _clients.size(); }
     void send(const Data& message);
+    /// Whether every client has taken all that was sent.
+    [[nodiscard]] bool isAllTaken() const;
 
 private:
     [[nodiscard]] std::optional<Data> createChannel(const Data& request);

@@ -3,6 +3,8 @@
 #include <gmock/gmock.h>
 
 #include <filesystem>
+#include <string>
+#include <utility>
 
 namespace velmora {
 namespace {
@@ -25,7 +27,8 @@ TEST_F(InfoCommandTest, CountsMessagesByLogCodeWithTheirSections) {
     const std::size_t simSize = extraRecord(0, makeDictionary()).size();
     ToolProcess process(tool({"info", path("drive.pcapng")}));
     EXPECT_EQ(process.exitStatus(), 0);
-    EXPECT_EQ(process.output(), "technology: Ostrel_GSM\n"
+    EXPECT_EQ(process.output(), "form:       recording\n"
+                                "technology: Ostrel_GSM\n"
                                 "first:      2026-11-16 05:00:00.000 UTC\n"
                                 "last:       2026-11-16 06:00:00.001 UTC\n"
                                 "duration:   3600.001 s\n"
@@ -55,7 +58,8 @@ TEST_F(InfoCommandTest, SerializedObjectsHaveNoLogCodes) {
     writeRecording("ifx.pcapng", "IFX", {{at(0), hex("01 02 03")}});
     ToolProcess process(tool({"info", path("ifx.pcapng")}));
     EXPECT_EQ(process.exitStatus(), 0);
-    EXPECT_EQ(process.output(), "technology: IFX\n"
+    EXPECT_EQ(process.output(), "form:       recording\n"
+                                "technology: IFX\n"
                                 "first:      2026-11-16 05:00:00.000 UTC\n"
                                 "last:       2026-11-16 05:00:00.000 UTC\n"
                                 "duration:   0.000 s\n"
@@ -73,7 +77,8 @@ TEST_F(InfoCommandTest, LossIsShownAndMakesTheInputBad) {
                               std::to_string(length - 6) + " of " + std::to_string(length) + " bytes\n";
     ToolProcess process(tool({"info", path("cut.pcapng")}));
     EXPECT_EQ(process.exitStatus(), 1);
-    EXPECT_EQ(process.output(), "technology: Ostrel_GSM\n"
+    EXPECT_EQ(process.output(), "form:       recording\n"
+                                "technology: Ostrel_GSM\n"
                                 "first:      2026-11-16 05:00:00.000 UTC\n"
                                 "last:       2026-11-16 05:00:00.000 UTC\n"
                                 "duration:   0.000 s\n"
@@ -97,12 +102,48 @@ TEST_F(InfoCommandTest, RecordingWithoutATechnologyIsCountedAllTheSame) {
     writeRecording("none.pcapng", "", {{at(0), rrState(5)}});
     ToolProcess process(tool({"info", path("none.pcapng")}));
     EXPECT_EQ(process.exitStatus(), 1);
-    EXPECT_THAT(process.output(), testing::StartsWith("technology: not named\n"));
+    EXPECT_THAT(process.output(), testing::StartsWith("form:       recording\ntechnology: not named\n"));
     EXPECT_THAT(process.output(), testing::EndsWith("  0x512C            1  -\n"));
     EXPECT_EQ(
         ownWords(process.errors()),
         "velmora-log: " + path("none.pcapng") +
             ": names no technology, wanted one of IFX, Ostrel_GSM, Ostrel_CDMA, Ostrel_LTE, Ostrel_UTRAN2\n");
+}
+
+TEST_F(InfoCommandTest, EachFormIsNamed) {
+    writeRecording("drive.pcapng", "Ostrel_GSM", {{at(0), rrState(4)}, {at(1), rrState(5)}});
+    for (const std::string form : {"velmora", "dlf"}) {
+        ToolProcess process(tool({"convert", path("drive.pcapng"), path("drive." + form)}));
+        ASSERT_EQ(process.exitStatus(), 0) << process.errors();
+    }
+    const std::pair<std::string, std::string> cases[] = {
+        {"drive.pcapng", "recording"}, {"drive.velmora", "snapshot"}, {"drive.dlf", "DLF log"}};
+    for (const auto& [name, form] : cases) {
+        ToolProcess process(tool({"info", path(name)}));
+        EXPECT_EQ(process.exitStatus(), 0) << process.errors();
+        EXPECT_THAT(process.output(),
+                    testing::StartsWith("form:       " + form + "\ntechnology: Ostrel_GSM\n"));
+        EXPECT_THAT(process.output(), testing::EndsWith("  0x512C            2  GSM RR Info\n"));
+    }
+}
+
+TEST_F(InfoCommandTest, RecordsOfCDMAAreCalledWhatTheyAre) {
+    writeRecording("c2k.pcapng", "Ostrel_CDMA",
+                   {{at(0), record(0x108A, "")}, {at(1), record(0x119C, "")}, {at(2), record(0x1375, "")}});
+    ToolProcess process(tool({"info", path("c2k.pcapng")}));
+    EXPECT_EQ(process.exitStatus(), 0) << process.errors();
+    EXPECT_THAT(process.output(), testing::EndsWith("    code     messages  records\n"
+                                                    "  0x108A            1  Finger C/I\n"
+                                                    "  0x119C            1  1x status\n"
+                                                    "  0x1375            1  -\n"));
+}
+
+TEST_F(InfoCommandTest, TechnologyIsTheUsersBeforeTheFiles) {
+    writeRecording("none.pcapng", "", {{at(0), rrState(5)}});
+    ToolProcess process(tool({"info", "--technology", "Ostrel_GSM", path("none.pcapng")}));
+    EXPECT_EQ(process.exitStatus(), 0) << process.errors();
+    EXPECT_THAT(process.output(), testing::StartsWith("form:       recording\ntechnology: Ostrel_GSM\n"));
+    EXPECT_THAT(process.output(), testing::EndsWith("  0x512C            1  GSM RR Info\n"));
 }
 
 TEST_F(InfoCommandTest, FileThatIsNotThereIsTold) {

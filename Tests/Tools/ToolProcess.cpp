@@ -11,6 +11,7 @@
 #include <fcntl.h>
 #include <sys/ioctl.h>
 #include <sys/mman.h>
+#include <sys/resource.h>
 #include <sys/wait.h>
 #include <unistd.h>
 
@@ -67,7 +68,7 @@ ToolProcess::ToolProcess(const Setup& setup, std::string program) {
     if (setup.outputFile)
         output.theirs =
             FileDescriptor(::open(setup.outputFile->c_str(), O_WRONLY | O_CREAT | O_CLOEXEC, 0600));
-    Ends errors = openPipe();
+    Ends errors = setup.errorsOnTerminal && !setup.onTerminal ? openTerminal() : openPipe();
     const FileDescriptor input = fileWith(setup.input.value_or(""));
 
     std::vector<std::string> words = {program};
@@ -90,7 +91,8 @@ ToolProcess::ToolProcess(const Setup& setup, std::string program) {
         }
         ::dup2(setup.onTerminal ? output.theirs.get() : input.get(), STDIN_FILENO);
         ::dup2(output.theirs.get(), STDOUT_FILENO);
-        ::dup2(errors.theirs.get(), STDERR_FILENO);
+        ::dup2(setup.errorsOnTerminal && setup.onTerminal ? output.theirs.get() : errors.theirs.get(),
+               STDERR_FILENO);
         ::execv(program.c_str(), arguments.data());
         ::_exit(127);
     }
@@ -144,6 +146,21 @@ std::optional<int> ToolProcess::exitStatus() {
         _status = WIFEXITED(status) ? WEXITSTATUS(status) : 128 + WTERMSIG(status);
     }
     return _status;
+}
+
+bool ToolProcess::waitForError(const std::string& text) {
+    const auto said = [&] { return _errors.text.find(text) != std::string::npos; };
+    return eventually([&] { return said() || (_output.ended && _errors.ended); }) && said();
+}
+
+void ToolProcess::limitFileSize(std::optional<std::uint64_t> bytes) const {
+    rlimit limit = {};
+    if (::getrlimit(RLIMIT_FSIZE, &limit) != 0)
+        throw std::runtime_error("no limit");
+    if (bytes)
+        limit.rlim_cur = *bytes;
+    if (::prlimit(_id, RLIMIT_FSIZE, &limit, nullptr) != 0)
+        throw std::runtime_error("not limited");
 }
 
 void ToolProcess::signal(int number) const {

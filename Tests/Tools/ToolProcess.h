@@ -4,6 +4,7 @@
 #include "Platform/Linux/MainLoop.h"
 #include "Platform/Linux/SocketWatch.h"
 
+#include <cstdint>
 #include <functional>
 #include <map>
 #include <memory>
@@ -29,7 +30,8 @@ public:
         std::vector<std::string> arguments;
         std::optional<std::string> input;               ///< standard input; empty where there is none
         std::map<std::string, std::string> environment; ///< beside the test's own
-        bool onTerminal = false; ///< standard input and output are a terminal of 60 columns and 12 rows
+        bool onTerminal = false;       ///< standard input and output are a terminal of 60 columns and 12 rows
+        bool errorsOnTerminal = false; ///< standard error is that terminal as well, or one of its own
         std::optional<std::string> outputFile; ///< standard output goes there
     };
 
@@ -48,7 +50,12 @@ public:
     /// Waits for the end. The exit status, 128 and the number for a signal; nothing when it never comes.
     [[nodiscard]] std::optional<int> exitStatus();
 
+    /// As `waitFor`, on standard error.
+    [[nodiscard]] bool waitForError(const std::string& text);
+
     void signal(int number) const;
+    /// From now on its files may not grow beyond this; absent: as far as the test's own.
+    void limitFileSize(std::optional<std::uint64_t> bytes) const;
     /// Types on the terminal.
     void type(const std::string& keys) const;
     void resize(unsigned short columns, unsigned short rows) const;

@@ -76,6 +76,31 @@ TEST_F(WatchCommandTest, PipeGetsEachRefreshAndTheLossOfTheConnection) {
     EXPECT_THAT(portFiles(), ElementsAre());
 }
 
+TEST_F(WatchCommandTest, ShowsAnotherTechnologyWhenTheModemChangesToIt) {
+    startService();
+    ToolProcess process(tool({"watch"}));
+    ASSERT_TRUE(isStreaming());
+    sendBand("GSM 900");
+    ASSERT_TRUE(process.waitFor("Band  GSM 900\n"));
+    _service.reset();
+    startService("Ostrel_GSM");
+    // Once as before, and once more with a display of its own.
+    ASSERT_TRUE(isStreaming(2));
+    _service->send(rrState(5));
+    ASSERT_TRUE(process.waitFor("RR State      RR_IDLE\n"));
+    process.signal(SIGINT);
+    EXPECT_EQ(process.exitStatus(), 0);
+    EXPECT_THAT(process.output(), EndsWith("GSM RR Info\n"
+                                           "  RR State      RR_IDLE\n"
+                                           "  RR Sub State  0\n"
+                                           "  RR Status     1\n"
+                                           "  RR Mode       Voice\n"
+                                           "UMTS RR Info\n"
+                                           "SIM Info\n"));
+    _service.reset();
+    EXPECT_THAT(portFiles(), ElementsAre());
+}
+
 TEST_F(WatchCommandTest, WithoutAServiceItWaits) {
     ToolProcess process(tool({"watch"}));
     ASSERT_TRUE(process.waitFor("Connecting...\n"));

@@ -1,0 +1,137 @@
+#include "Platform/Console.h"
+#include "Platform/Linux/FileResources.h"
+#include "Platform/TelephonyService.h"
+#include "Recording/MessageReader.h"
+#include "Telephony/ScenarioRegistry.h"
+#include "Tools/DecodeWriter.h"
+#include "Tools/JSONText.h"
+#include "Tools/Output.h"
+#include "Tools/Report.h"
+#include "Tools/TimeText.h"
+
+#include <benchmark/benchmark.h>
+
+#include <cstdlib>
+
+#include <fcntl.h>
+#include <unistd.h>
+
+// What `velmora-log decode` costs a message beyond decoding it: the text of a section and of a time, and
+// whole drives in their formats, written to nowhere. Bytes are those of the text, items are messages.
+
+namespace velmora {
+namespace {
+
+/// A section of six values, as most are.
+Value section() {
+    return std::make_shared<Dictionary>(std::initializer_list<Dictionary::Entry>{
+        {"PLMN Sel Mod", "Automatic"},
+        {"Mobile Country Code", "001"},
+        {"Mobile Network Code", "01"},
+        {"Location Area Code", "4101"},
+        {"Routing Area Code", "1"},
+        {"Service Type", "CS_PS_SERVICE"},
+    });
+}
+
+void jsonOfASection(benchmark::State& state) {
+    const Value node = section();
+    TextBuffer out;
+    for (auto step : state) {
+        out.clear();
+        appendJson(out, node);
+        benchmark::DoNotOptimize(out.view().data());
+        benchmark::ClobberMemory();
+    }
+    state.SetBytesProcessed(state.iterations() * static_cast<std::int64_t>(out.size()));
+}
+BENCHMARK(jsonOfASection);
+
+void textOfATime(benchmark::State& state) {
+    TextBuffer out;
+    TimeText text;
+    Time moment{};
+    for (auto step : state) {
+        out.clear();
+        text.append(out, moment);
+        moment += std::chrono::milliseconds(37);
+        benchmark::DoNotOptimize(out.view().data());
+        benchmark::ClobberMemory();
+    }
+    state.SetBytesProcessed(state.iterations() * static_cast<std::int64_t>(out.size()));
+}
+BENCHMARK(textOfATime);
+
+/// A drive that is in memory already.
+class DriveReader final : public MessageReader {
+public:
+    DriveReader(const ScenarioKind& kind, std::size_t count) {
+        const std::unique_ptr<Scenario> scenario = kind.make(1);
+        _technology = shortTechnologyName(scenario->technology());
+        for (std::size_t i = 0; i < count; ++i) {
+            const ScenarioEvent event = scenario->next();
+            _messages.push_back({Time(event.offset), event.message, i + 1, 0});
+        }
+    }
+
+    void rewind() { _next = 0; }
+    [[nodiscard]] std::optional<LoggedMessage> next() override {
+        if (_next == _messages.size())
+            return std::nullopt;
+        return _messages[_next++];
+    }
+    [[nodiscard]] const std::string& technology() const override { return _technology; }
+    [[nodiscard]] const std::optional<Failure>& failure() const override { return _failure; }
+
+private:
+    std::string _technology;
+    std::vector<LoggedMessage> _messages;
+    std::size_t _next = 0;
+    std::optional<Failure> _failure;
+};
+
+enum Printed : std::int64_t { TheEnd, EveryRefresh, EveryMessage };
+
+/// The scenario's place in the registry, and what is printed.
+void decodeDrive(benchmark::State& state) {
+    constexpr std::size_t count = 20'000;
+    const ScenarioKind& kind = scenarioKinds()[static_cast<std::size_t>(state.range(0))];
+    DecodeOptions options;
+    options.files = {"drive"};
+    if (state.range(1) == TheEnd)
+        options.format = DecodeOptions::Format::Json;
+    else
+        options.format = DecodeOptions::Format::JsonLines;
+    if (state.range(1) == EveryMessage)
+        options.every = DecodeOptions::Every::Message;
+    constexpr const char* names[] = {"in the end", "every refresh", "every message"};
+    state.SetLabel(std::string(kind.name) + ", " + names[state.range(1)]);
+
+    redirectConsole(stderr);
+    FileResources files;
+    setResources(&files);
+    const int nowhere = ::open("/dev/null", O_WRONLY | O_CLOEXEC);
+    {
+        Output output(nowhere);
+        WorkContext context("drive");
+        DriveReader reader(kind, count);
+        for (auto step : state) {
+            reader.rewind();
+            const std::unique_ptr<DecodeWriter> writer =
+                DecodeWriter::make(options, "drive", false, "", output);
+            const Result<Decoded> decoded = decodeMessages(reader, {}, context, *writer);
+            if (!decoded)
+                std::abort();
+            writer->finish(*decoded);
+        }
+    }
+    setResources(nullptr);
+    ::close(nowhere);
+    state.SetItemsProcessed(state.iterations() * static_cast<std::int64_t>(count));
+}
+BENCHMARK(decodeDrive)
+    ->ArgsProduct({{0, 1, 2, 3, 4}, {TheEnd, EveryRefresh, EveryMessage}})
+    ->Unit(benchmark::kMillisecond);
+
+} // namespace
+} // namespace velmora

@@ -1,0 +1,45 @@
+#pragma once
+
+#include "Platform/Clock.h"
+#include "Platform/Result.h"
+#include "Recording/MessageReader.h"
+
+#include <memory>
+#include <optional>
+#include <string>
+#include <string_view>
+
+namespace velmora {
+
+class WorkContext;
+
+/// The forms of a file of log messages, which its name ends in.
+enum class FileForm {
+    Recording, ///< ".pcapng"
+    Snapshot,  ///< ".velmora"
+    DLFLog,    ///< ".dlf"
+};
+
+/// Absent where the name ends in none of them.
+[[nodiscard]] std::optional<FileForm> formFromName(std::string_view name);
+/// "NAME that ends in" any of these: ".pcapng, .velmora or .dlf".
+inline constexpr const char* formSuffixes = ".pcapng, .velmora or .dlf";
+
+/// What one file becomes of another.
+struct Conversion {
+    FileForm form = FileForm::Recording;
+    std::string title;       ///< of the input
+    std::string name;        ///< of the output
+    std::string technology;  ///< before the one that the input names; empty for that one
+    std::string description; ///< a snapshot's
+};
+
+/// Reads messages to their end and writes them to an open file, which stays the caller's and gets nothing but
+/// this. A recording has all of them with their times; a DLF log has those that it can hold, and the user is
+/// told of the others; a snapshot is the one that the application would have written after the last refresh.
+/// Whether all messages were taken. Fails where there is no such file to be made of them, or it cannot be
+/// written; `context` is kept at the record at hand, exceptions of the decoders pass through.
+[[nodiscard]] Result<bool> convertMessages(MessageReader& reader, const Conversion& conversion,
+                                           int descriptor, WorkContext& context);
+
+} // namespace velmora

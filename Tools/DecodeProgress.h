@@ -1,0 +1,47 @@
+#pragma once
+
+#include "Platform/Clock.h"
+
+#include <chrono>
+#include <cstdint>
+#include <functional>
+#include <optional>
+#include <string>
+#include <string_view>
+
+namespace velmora {
+
+/// How far a long file has been decoded, as a line: "37 %, 85 MiB/s, 12 s left". Looks at the clock no more
+/// than once a MiB, and shows a line no more than five times a second.
+class DecodeProgress {
+public:
+    /// Shorter input is done before anybody asks.
+    static constexpr std::uint64_t smallestInput = std::uint64_t{64} << 20;
+
+    using Show = std::function<void(std::string_view line)>;
+
+    /// `size`: the input's, in bytes, above 0. `clock` must outlive it. Shows 0 % at once.
+    DecodeProgress(std::uint64_t size, const Clock& clock, Show show);
+
+    /// The input has been read up to there.
+    void at(std::uint64_t offset) {
+        if (offset >= _nextLook)
+            look(offset);
+    }
+
+private:
+    void look(std::uint64_t offset);
+
+    std::uint64_t _size;
+    const Clock& _clock;
+    Show _show;
+    Time _started;
+    Time _shown;
+    std::uint64_t _nextLook;
+};
+
+/// The size of a file that may be opened by that path, "-" being standard input; absent for a pipe and
+/// whatever else has no size that is known.
+[[nodiscard]] std::optional<std::uint64_t> inputSize(const std::string& path);
+
+} // namespace velmora

@@ -1,0 +1,43 @@
+#pragma once
+
+#include "Platform/Resources.h"
+
+#include <string>
+#include <string_view>
+#include <vector>
+
+namespace velmora {
+
+/// The process's resources for as long as it lives, which remembers that one could not be had: a decoder
+/// writes that to the log and goes on without its template, as it does on a phone, but what it then shows is
+/// not what the file holds. Main thread only; puts the earlier ones back in the end.
+class NotedResources final : public Resources {
+public:
+    NotedResources() : _others(setResources(this)) {}
+    ~NotedResources() override { setResources(_others); }
+    NotedResources(const NotedResources&) = delete;
+    NotedResources& operator=(const NotedResources&) = delete;
+
+    [[nodiscard]] Result<Data> read(std::string_view name, std::string_view type) const override {
+        Result<Data> content = _others->read(name, type);
+        if (!content && _failure.empty())
+            _failure = content.reason();
+        return content;
+    }
+    [[nodiscard]] std::vector<std::string> list(std::string_view type) const override {
+        return _others->list(type);
+    }
+    [[nodiscard]] std::optional<std::string> bundleVersion() const override {
+        return _others->bundleVersion();
+    }
+    [[nodiscard]] std::string buildStamp() const override { return _others->buildStamp(); }
+
+    /// Why the first could not be had; empty where all could.
+    [[nodiscard]] const std::string& failure() const { return _failure; }
+
+private:
+    Resources* _others;
+    mutable std::string _failure;
+};
+
+} // namespace velmora

@@ -1,0 +1,56 @@
+#pragma once
+
+#include <algorithm>
+#include <cstddef>
+#include <cstring>
+#include <memory>
+#include <string_view>
+#include <utility>
+
+namespace velmora {
+
+/// Text that is appended to and then used again: the storage grows and stays, so that a writer of many lines
+/// allocates nothing once it has written the longest.
+class TextBuffer {
+public:
+    [[nodiscard]] std::string_view view() const { return {_characters.get(), _size}; }
+    [[nodiscard]] std::size_t size() const { return _size; }
+    void clear() { _size = 0; }
+    /// Precondition: `size` is not above size().
+    void truncate(std::size_t size) { _size = size; }
+
+    void append(char character) {
+        *room(1) = character;
+        ++_size;
+    }
+    void append(std::string_view text) {
+        std::memcpy(room(text.size()), text.data(), text.size());
+        _size += text.size();
+    }
+
+    /// Where the next `count` characters may be written; they belong to the text once `advance` says so.
+    [[nodiscard]] char* room(std::size_t count) {
+        if (_capacity - _size < count || !_characters)
+            grow(count);
+        return _characters.get() + _size;
+    }
+    /// Precondition: no more than the latest `room` asked for.
+    void advance(std::size_t count) { _size += count; }
+
+private:
+    void grow(std::size_t count) {
+        constexpr std::size_t smallest = 1024;
+        const std::size_t capacity = std::max(smallest, std::max(2 * _capacity, _size + count));
+        auto characters = std::make_unique<char[]>(capacity);
+        if (_size > 0)
+            std::memcpy(characters.get(), _characters.get(), _size);
+        _characters = std::move(characters);
+        _capacity = capacity;
+    }
+
+    std::unique_ptr<char[]> _characters;
+    std::size_t _size = 0;
+    std::size_t _capacity = 0;
+};
+
+} // namespace velmora
