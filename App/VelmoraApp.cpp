@@ -25,7 +25,7 @@ constexpr const char* connecting = "Connecting...";
 
 VelmoraApp::VelmoraApp(int& argc, char** argv, const PlatformMaker& makePlatform)
     : Application(argc, argv), _platform(makePlatform()) {
-    setName("Velmora", "com.velmora.Velmora");
+    setName("Velmora", "com.velmora.velmora");
 }
 
 VelmoraApp::~VelmoraApp() {

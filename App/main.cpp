@@ -1,12 +1,11 @@
+#include "App/LinuxAppPlatform.h"
 #include "App/SelfTest.h"
 #include "App/VelmoraApp.h"
 #include "Platform/Linux/FileResources.h"
 #include "Platform/Linux/LinuxFileSystem.h"
-#include "Platform/Linux/LinuxMessagePorts.h"
-#include "Platform/Linux/LinuxPreferences.h"
-#include "Platform/Linux/LinuxTelephonyService.h"
 #include "Platform/Linux/ProgramLog.h"
-#include "Platform/Linux/QtMainQueue.h"
+#include "Platform/Linux/ServiceStarter.h"
+#include "Platform/Linux/Termination.h"
 #include "Platform/SystemLog.h"
 
 #include <CLI/CLI.hpp>
@@ -14,7 +13,6 @@
 #include <chrono>
 #include <cstdio>
 #include <memory>
-#include <optional>
 #include <string>
 
 namespace {
@@ -33,6 +31,7 @@ struct Options {
     LogKind log = LogKind::Syslog;
     int logLevel = LogPriority::Notice;
     bool isSelfTest = false;
+    bool startsService = false;
 };
 
 void declare(CLI::App& app, Options& options) {
@@ -55,33 +54,15 @@ void declare(CLI::App& app, Options& options) {
     app.add_option("--log-level", options.logLevel, "The least urgent lines that are written, 0 to 7")
         ->check(CLI::Range(0, 7))
         ->capture_default_str();
+    app.add_flag("--start-service", options.startsService,
+                 "Bring up the telephony service first where none is running");
     app.add_flag("--self-test", options.isSelfTest, "Open every screen on the first data, then exit");
     app.footer("Velmora shows what a telephony service sends. With a synthetic drive as the service:\n"
                "  velmora-telephonyd --source scenario:gsm,seed=1 &\n"
-               "  velmora");
+               "  velmora\n"
+               "With the installed service, on what the modem reports:\n"
+               "  velmora --start-service");
 }
-
-class LinuxAppPlatform final : public AppPlatform {
-public:
-    explicit LinuxAppPlatform(const Options& options) : _files(options.files) {
-        if (const auto made = _files.makeStandardLogDirectory(); !made)
-            logFormat(LogPriority::Error, "Snapshots: %s", made.reason().c_str());
-    }
-    [[nodiscard]] ModelPlatform model() override {
-        return {_ports, _queue, _telephony, _clock,
-                [] { return std::optional<std::string>(logChannelPortName()); }};
-    }
-    [[nodiscard]] FileSystem& files() override { return _files; }
-    [[nodiscard]] Preferences& preferences() override { return _preferences; }
-
-private:
-    QtMainQueue _queue;
-    LinuxMessagePorts _ports;
-    LinuxTelephonyService _telephony{_ports};
-    MachineClock _clock;
-    LinuxFileSystem _files;
-    LinuxPreferences _preferences;
-};
 
 int show(const Options& options, char* program) {
     // Before everything else, so that the last lines are still written.
@@ -90,12 +71,18 @@ int show(const Options& options, char* program) {
     setResources(&files);
     int count = 1;
     char* arguments[] = {program, nullptr};
-    VelmoraApp app(count, arguments, [&options] { return std::make_unique<LinuxAppPlatform>(options); });
+    VelmoraApp app(count, arguments,
+                   [&options] { return std::make_unique<LinuxAppPlatform>(options.files); });
+    if (options.startsService) {
+        // Before the first attempt to connect, since the next one comes seconds later.
+        if (const auto up = bringUpTelephonyService(); !up)
+            logFormat(LogPriority::Error, "telephony service: %s", up.reason().c_str());
+    }
     app.platform().model().queue.after(serviceDelay, [&app] {
         if (!app.model().isConnected())
             logLine(LogPriority::Notice,
-                    "no telephony service answers; one with a synthetic drive is started by: "
-                    "velmora-telephonyd --source scenario:gsm,seed=1");
+                    "no telephony service answers; the installed one is started by: velmora --start-service, "
+                    "one with a synthetic drive by: velmora-telephonyd --source scenario:gsm,seed=1");
     });
     std::unique_ptr<SelfTest> selfTest;
     if (options.isSelfTest)
@@ -106,6 +93,7 @@ int show(const Options& options, char* program) {
 } // namespace
 
 int main(int argc, char** argv) {
+    endOnUncaughtExceptions("velmora");
     Options options;
     CLI::App app;
     declare(app, options);

@@ -1,12 +1,9 @@
+#include "App/LinuxAppPlatform.h"
 #include "App/VelmoraApp.h"
 #include "App/VelmoraPaneController.h"
 #include "Platform/Console.h"
 #include "Platform/Linux/FileResources.h"
 #include "Platform/Linux/LinuxFileSystem.h"
-#include "Platform/Linux/LinuxMessagePorts.h"
-#include "Platform/Linux/LinuxPreferences.h"
-#include "Platform/Linux/LinuxTelephonyService.h"
-#include "Platform/Linux/QtMainQueue.h"
 #include "Platform/PropertyList.h"
 #include "Tests/Support/FakeClock.h"
 #include "Tests/Support/FakeMainQueue.h"
@@ -236,29 +233,13 @@ int compare() {
     return 0;
 }
 
-/// The application on the machine, for the flood.
-class MachinePlatform final : public AppPlatform {
-public:
-    ModelPlatform model() override {
-        return {_ports, _queue, _telephony, _clock,
-                [] { return std::optional(logChannelPortName("com.velmora.bench")); }};
-    }
-    FileSystem& files() override { return _files; }
-    Preferences& preferences() override { return _preferences; }
-
-private:
-    QtMainQueue _queue;
-    LinuxMessagePorts _ports;
-    LinuxTelephonyService _telephony{_ports};
-    MachineClock _clock;
-    LinuxFileSystem _files{LinuxFileSystem::Options{}};
-    LinuxPreferences _preferences;
-};
-
 int flood(int argc, char** argv, int seconds) {
     FileResources files;
     setResources(&files);
-    VelmoraApp app(argc, argv, [] { return std::make_unique<MachinePlatform>(); });
+    VelmoraApp app(argc, argv, [] {
+        return std::make_unique<LinuxAppPlatform>(LinuxFileSystem::Options{},
+                                                  logChannelPortName("com.velmora.bench"));
+    });
     std::vector<double> late_ms;
     QElapsedTimer since;
     QTimer probe;

@@ -9,6 +9,7 @@
 #include <QThread>
 
 #include <csignal>
+#include <cstdlib>
 #include <filesystem>
 #include <functional>
 #include <memory>
@@ -25,14 +26,21 @@ class VelmoraProcessTest : public testing::Test {
 protected:
     static constexpr int patience_ms = 40'000;
 
-    std::unique_ptr<QProcess> start(const char* program, const QStringList& arguments) {
-        auto process = std::make_unique<QProcess>();
-        auto environment = QProcessEnvironment::systemEnvironment();
+    VelmoraProcessTest() {
         environment.insert("VELMORA_PORT_DIR", path("ports"));
         environment.insert("XDG_STATE_HOME", path("state"));
         environment.insert("XDG_CONFIG_HOME", path("config"));
         environment.remove("VELMORA_SYSROOT");
         environment.remove("VELMORA_LOG_DIRECTORY");
+        environment.remove("VELMORA_SOURCE");
+    }
+    ~VelmoraProcessTest() override {
+        if (startedService > 0)
+            ::kill(startedService, SIGKILL);
+    }
+
+    std::unique_ptr<QProcess> start(const char* program, const QStringList& arguments) {
+        auto process = std::make_unique<QProcess>();
         process->setProcessEnvironment(environment);
         process->setStandardOutputFile(path(program) + ".out");
         process->setStandardErrorFile(path(program) + ".err");
@@ -52,6 +60,15 @@ protected:
     [[nodiscard]] std::string text(const char* name) const {
         QFile file(path(name));
         return file.open(QIODevice::ReadOnly) ? file.readAll().toStdString() : "";
+    }
+    void put(const char* name, const QByteArray& content) const {
+        const auto place = directory / name;
+        std::filesystem::create_directories(place.parent_path());
+        QFile file(path(name));
+        ASSERT_TRUE(file.open(QIODevice::WriteOnly));
+        ASSERT_EQ(file.write(content), content.size());
+        file.close();
+        ASSERT_TRUE(file.setPermissions(QFile::ReadOwner | QFile::WriteOwner | QFile::ExeOwner));
     }
     static bool eventually(const std::function<bool()>& condition) {
         QElapsedTimer waited;
@@ -74,6 +91,9 @@ protected:
     }
 
     TemporaryDirectory directory;
+    QProcessEnvironment environment = QProcessEnvironment::systemEnvironment();
+    /// A service that the program has started, to be ended with the test.
+    pid_t startedService = 0;
 };
 
 class VelmoraSelfTest : public VelmoraProcessTest, public testing::WithParamInterface<const char*> {};
@@ -113,10 +133,71 @@ TEST_F(VelmoraProcessTest, WithoutAServiceTheLogSaysHowToStartOne) {
     const auto app = start("velmora", {"--log", "stderr"});
     EXPECT_TRUE(eventually([&] {
         return text("velmora.err")
-                   .find("<5>no telephony service answers; one with a synthetic drive is started "
-                         "by: velmora-telephonyd --source scenario:gsm,seed=1\n") != std::string::npos;
+                   .find("<5>no telephony service answers; the installed one is started by: velmora "
+                         "--start-service, one with a synthetic drive by: velmora-telephonyd --source "
+                         "scenario:gsm,seed=1\n") != std::string::npos;
     })) << text("velmora.err");
     EXPECT_THAT(text("velmora.err"), HasSubstr("<3>Could not create the ports necessary\n"));
+    end(*app);
+}
+
+/// The process that a line of the log names after `before`; 0 where there is none.
+pid_t processIn(const std::string& log, const std::string& before) {
+    const auto at = log.find(before);
+    return at == log.npos ? 0 : static_cast<pid_t>(std::atoi(log.c_str() + at + before.size()));
+}
+
+TEST_F(VelmoraProcessTest, BringsUpTheServiceWhereNoneIsRunning) {
+    environment.insert("VELMORA_SOURCE", "scenario:gsm,seed=1");
+    const std::string started =
+        "<5>started " VELMORA_BUILD_DIR "/velmora-telephonyd --source scenario:gsm,seed=1 as process ";
+    for (const bool isFirst : {true, false}) {
+        const auto app = start("velmora", {"--start-service", "--self-test", "--log", "stderr"});
+        EXPECT_EQ(exitStatus(*app), 0) << text("velmora.err");
+        // The first attempt to connect succeeds.
+        EXPECT_THAT(text("velmora.err"), Not(HasSubstr("Could not create the ports")));
+        if (isFirst)
+            EXPECT_THAT(text("velmora.err"), HasSubstr(started));
+        else
+            EXPECT_THAT(text("velmora.err"), Not(HasSubstr("started "))) << "it runs on";
+        if (isFirst)
+            startedService = processIn(text("velmora.err"), started);
+    }
+    ASSERT_GT(startedService, 0);
+    ::kill(startedService, SIGTERM);
+    EXPECT_TRUE(eventually([&] { return !exists("ports/com.velmora.vox.server"); }));
+}
+
+TEST_F(VelmoraProcessTest, LeavesTheServiceToTheServiceManagerWhereThereIsOne) {
+    // A manager that keeps its arguments and starts the service as the unit would.
+    put("bin/systemctl",
+        "#!/bin/sh\n"
+        "echo \"$*\" >>\"$HOME/asked\"\n" VELMORA_BUILD_DIR
+        "/velmora-telephonyd --source scenario:gsm,seed=1 2>/dev/null &\n"
+        "echo $! >\"$HOME/service\"\n"
+        "until [ -S \"$XDG_RUNTIME_DIR/velmora/com.velmora.vox.server\" ]; do sleep 0.01; done\n");
+    environment.remove("VELMORA_PORT_DIR");
+    environment.insert("HOME", path("."));
+    environment.insert("XDG_RUNTIME_DIR", path("."));
+    environment.insert("PATH", path("bin") + ":/usr/bin:/bin");
+    const auto app = start("velmora", {"--start-service", "--self-test", "--log", "stderr"});
+    EXPECT_EQ(exitStatus(*app), 0) << text("velmora.err");
+    startedService = processIn(text("service"), "");
+    EXPECT_EQ(text("asked"), "--user --quiet start velmora-telephonyd.service\n");
+    EXPECT_THAT(text("velmora.err"), HasSubstr("<5>started velmora-telephonyd.service\n"));
+    EXPECT_THAT(text("velmora.err"), Not(HasSubstr("as process")));
+}
+
+TEST_F(VelmoraProcessTest, AServiceThatDoesNotComeUpIsAnErrorLineAndTheScreenIsThere) {
+    environment.insert("VELMORA_SOURCE", "scenario:none");
+    const auto app = start("velmora", {"--start-service", "--log", "stderr"});
+    EXPECT_TRUE(eventually([&] {
+        return text("velmora.err").find("<3>Could not create the ports necessary\n") != std::string::npos;
+    })) << text("velmora.err");
+    EXPECT_THAT(
+        text("velmora.err"),
+        HasSubstr("<3>telephony service: " VELMORA_BUILD_DIR
+                  "/velmora-telephonyd --source scenario:none has ended, wanted a service that answers\n"));
     end(*app);
 }
 
@@ -135,7 +216,7 @@ TEST_F(VelmoraProcessTest, HelpShowsTheOptionsAndAnExample) {
     const std::string help = text("velmora.out");
     for (const char* part :
          {"--sysroot", "VELMORA_SYSROOT", "--log-directory", "VELMORA_LOG_DIRECTORY", "--log ", "--log-level",
-          "--self-test", "--version", "velmora-telephonyd --source scenario:gsm,seed=1"})
+          "--self-test", "--start-service", "--version", "velmora-telephonyd --source scenario:gsm,seed=1"})
         EXPECT_THAT(help, HasSubstr(part));
 }
 

@@ -1,0 +1,44 @@
+#pragma once
+
+#include "App/AppPlatform.h"
+#include "Platform/Clock.h"
+#include "Platform/Linux/LinuxFileSystem.h"
+#include "Platform/Linux/LinuxMessagePorts.h"
+#include "Platform/Linux/LinuxPreferences.h"
+#include "Platform/Linux/LinuxTelephonyService.h"
+#include "Platform/Linux/QtMainQueue.h"
+#include "Platform/SystemLog.h"
+
+#include <optional>
+#include <string>
+#include <utility>
+
+namespace velmora {
+
+/// The machine that the application runs on. Main thread only; stands on the application's event loop.
+class LinuxAppPlatform final : public AppPlatform {
+public:
+    /// Makes the directory for snapshots where it is the standard one. `portName` is the application's own.
+    explicit LinuxAppPlatform(const LinuxFileSystem::Options& files,
+                              std::string portName = logChannelPortName())
+        : _files(files), _portName(std::move(portName)) {
+        if (const auto made = _files.makeStandardLogDirectory(); !made)
+            logFormat(LogPriority::Error, "Snapshots: %s", made.reason().c_str());
+    }
+    [[nodiscard]] ModelPlatform model() override {
+        return {_ports, _queue, _telephony, _clock, [name = _portName] { return std::optional(name); }};
+    }
+    [[nodiscard]] FileSystem& files() override { return _files; }
+    [[nodiscard]] Preferences& preferences() override { return _preferences; }
+
+private:
+    QtMainQueue _queue;
+    LinuxMessagePorts _ports;
+    LinuxTelephonyService _telephony{_ports};
+    MachineClock _clock;
+    LinuxFileSystem _files;
+    LinuxPreferences _preferences;
+    std::string _portName;
+};
+
+} // namespace velmora

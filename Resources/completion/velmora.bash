@@ -1,0 +1,143 @@
+# shellcheck shell=bash
+# Completion of Velmora's programs for bash, by way of bash-completion, which loads it under each one's name.
+
+_velmora_technologies=(IFX Ostrel_GSM Ostrel_CDMA Ostrel_LTE Ostrel_UTRAN2)
+
+# Offers those of the words that begin as the present one does.
+_velmora_offer() {
+    local word
+    COMPREPLY=()
+    for word in "$@"; do
+        [[ $word != "$cur"* ]] || COMPREPLY+=("$word")
+    done
+}
+
+# Completes the value of an option that all programs have; fails where there is none to complete.
+_velmora_common_value() {
+    case $prev in
+    --log) _velmora_offer syslog stderr ;;
+    --log-level) _velmora_offer 0 1 2 3 4 5 6 7 ;;
+    *) return 1 ;;
+    esac
+}
+
+_velmora() {
+    local cur prev words cword split
+    _init_completion -s || return
+    _velmora_common_value && return
+    case $prev in
+    --sysroot | --log-directory)
+        _filedir -d
+        return
+        ;;
+    esac
+    $split && return
+    _velmora_offer -h --help --version --sysroot --log-directory --start-service --self-test --log --log-level
+}
+
+# Completes a source: its kind, a scenario's name or a file, and then the options behind commas.
+_velmora_source() {
+    local source=$cur head=${cur%,*},
+    case $source in
+    scenario:*,*) _velmora_offer "${head}seed=" "${head}speed=" ;;
+    scenario:*) _velmora_offer scenario:{gsm,c2k,lte,utran,ifx} ;;
+    replay:*,technology=*)
+        # What stands before the equals sign is a word of its own to bash.
+        cur=${cur##*=}
+        _velmora_offer "${_velmora_technologies[@]}"
+        ;;
+    replay:*,*) _velmora_offer "${head}speed=" "${head}loop" "${head}technology=" ;;
+    replay:*)
+        cur=${cur#replay:}
+        _filedir
+        COMPREPLY=("${COMPREPLY[@]/#/replay:}")
+        ;;
+    modemmanager,*) _velmora_offer modemmanager,modem= ;;
+    *) _velmora_offer scenario: replay: modemmanager ;;
+    esac
+    # An option may follow, or a name.
+    compopt -o nospace 2>/dev/null
+    __ltrim_colon_completions "$source"
+}
+
+_velmora_telephonyd() {
+    local cur prev words cword split
+    _init_completion -s -n : || return
+    _velmora_common_value && return
+    if [[ $prev == --source ]]; then
+        _velmora_source
+        return
+    fi
+    $split && return
+    _velmora_offer -h --help --version --source --log --log-level
+}
+
+_velmora_log() {
+    local cur prev words cword split
+    _init_completion -s || return
+    _velmora_common_value && return
+    local i command='' files=0
+    for ((i = 1; i < cword; ++i)); do
+        case ${words[i]} in
+        --log | --log-level | --format | --every | --select | --from | --to | --technology | --jobs | --duration | \
+            --count | --description)
+            ((++i))
+            ;;
+        -?*) ;;
+        *)
+            if [[ -z $command ]]; then
+                command=${words[i]}
+            else
+                ((++files))
+            fi
+            ;;
+        esac
+    done
+    case $prev in
+    --format)
+        _velmora_offer text json jsonl csv
+        return
+        ;;
+    --every)
+        _velmora_offer refresh message
+        return
+        ;;
+    --technology)
+        _velmora_offer "${_velmora_technologies[@]}"
+        return
+        ;;
+    --select | --from | --to | --jobs | --duration | --count | --description)
+        return # nothing that could be guessed
+        ;;
+    esac
+    $split && return
+
+    local options=(-h --help --log --log-level)
+    case $command in
+    '')
+        if [[ $cur == -* ]]; then
+            _velmora_offer "${options[@]}" --version
+        else
+            _velmora_offer decode watch record convert info
+        fi
+        return
+        ;;
+    decode) options+=(--format --every --select --from --to --technology --jobs) ;;
+    watch) options+=(--once) ;;
+    record) options+=(--force --duration --count) ;;
+    convert) options+=(--force --technology --description) ;;
+    info) options+=(--technology) ;;
+    esac
+    if [[ $cur == -* ]]; then
+        _velmora_offer "${options[@]}"
+        return
+    fi
+    # As many files as the command takes.
+    case $command:$files in
+    decode:* | record:0 | convert:[01] | info:0) _filedir '@(pcapng|velmora|dlf)' ;;
+    esac
+}
+
+complete -F _velmora velmora
+complete -F _velmora_telephonyd velmora-telephonyd
+complete -F _velmora_log velmora-log

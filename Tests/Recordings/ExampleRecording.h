@@ -1,0 +1,42 @@
+#pragma once
+
+#include "Platform/Clock.h"
+#include "Platform/Result.h"
+#include "Telephony/ScenarioRegistry.h"
+
+#include <cstdint>
+#include <functional>
+#include <span>
+#include <string>
+#include <string_view>
+
+namespace velmora {
+
+/// A recording of this folder: excerpts of a scenario's drive, which is too long to be kept whole. Messages
+/// are stamped as if each had arrived a fixed time after the moment that its record tells, so that all comes
+/// of the table in the source, bit by bit. Main thread only.
+struct ExampleRecording {
+    /// Seconds of the drive, the end left out; in order, and apart from one another.
+    struct Excerpt {
+        double from_s;
+        double to_s;
+    };
+
+    std::string_view scenario; ///< its name, and the recording's
+    std::uint64_t seed;
+    std::span<const Excerpt> excerpts;
+
+    /// "gsm.pcapng"
+    [[nodiscard]] std::string fileName() const { return std::string(scenario) + ".pcapng"; }
+    /// A new scenario at its beginning.
+    [[nodiscard]] std::unique_ptr<Scenario> makeScenario() const;
+    /// Calls `take` for every message, with the moment of its arrival.
+    void eachMessage(const std::function<void(Time, const Data&)>& take) const;
+    /// Writes the recording, over one that is there.
+    [[nodiscard]] Result<Done> write(const std::string& path) const;
+};
+
+/// One a scenario, in the registry's order.
+[[nodiscard]] std::span<const ExampleRecording> exampleRecordings();
+
+} // namespace velmora

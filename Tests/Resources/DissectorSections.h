@@ -1,0 +1,26 @@
+#pragma once
+
+#include <cstdint>
+#include <string>
+#include <string_view>
+#include <vector>
+
+namespace velmora {
+
+/// The technologies whose messages are records, by their short names, in the order of the dissector's table.
+[[nodiscard]] std::vector<std::string> recordTechnologies();
+
+/// The sections of a technology's decoder that want a log code, each once, in calling order; none where the
+/// decoder has no sections.
+[[nodiscard]] std::vector<std::string> sectionsWanting(std::string_view technology, std::uint32_t code);
+
+/// What a record of the technology without sections is called; empty where its decoder does not know the
+/// code.
+[[nodiscard]] std::string recordName(std::uint32_t code);
+
+/// The dissector's tables of log codes, with sections and with names of records, as they have to be, line by
+/// line.
+[[nodiscard]] std::string dissectorSections();
+[[nodiscard]] std::string dissectorRecords();
+
+} // namespace velmora

@@ -1,0 +1,288 @@
+#include "Recording/OpenMessages.h"
+#include "Recording/RecordHeader.h"
+#include "Recording/RecordTime.h"
+#include "Tests/Recording/PcapngFile.h"
+#include "Tests/Recordings/ExampleRecording.h"
+#include "Tests/Resources/Dissection.h"
+#include "Tests/Resources/DissectorSections.h"
+#include "Tests/Support/ShellCommand.h"
+#include "Tests/Support/TemporaryDirectory.h"
+
+#include <gmock/gmock.h>
+#include <gtest/gtest.h>
+#include <nlohmann/json.hpp>
+
+#include <algorithm>
+#include <cctype>
+#include <chrono>
+#include <cstdio>
+#include <ctime>
+#include <filesystem>
+#include <sstream>
+#include <string>
+#include <vector>
+
+/// The Wireshark dissector against our own reading of the same messages.
+
+namespace velmora {
+namespace {
+
+using testing::Each;
+using testing::ElementsAre;
+using testing::HasSubstr;
+using testing::Not;
+
+std::string formatted(const char* format, auto value) {
+    char text[64];
+    std::snprintf(text, sizeof text, format, value);
+    return text;
+}
+
+std::string lowerHex(Bytes bytes) {
+    std::string text;
+    for (const std::uint8_t byte : bytes)
+        text += formatted("%02x", static_cast<unsigned>(byte));
+    return text;
+}
+
+/// "Jan  5, 2026 08:00:00.048000005 UTC", as the capture tools write a moment.
+std::string momentText(Time moment) {
+    const auto seconds = std::chrono::floor<std::chrono::seconds>(moment);
+    const std::time_t time = std::chrono::system_clock::to_time_t(
+        std::chrono::time_point_cast<std::chrono::system_clock::duration>(seconds));
+    std::tm parts{};
+    ::gmtime_r(&time, &parts);
+    char text[64];
+    std::strftime(text, sizeof text, "%b %e, %Y %H:%M:%S", &parts);
+    return text + formatted(".%09ld UTC", static_cast<long>((moment - seconds).count()));
+}
+
+/// Technology, prefix, type, length, code, sections, record, time and payload as we read them, separated by
+/// tabs. A code that no decoder looks at is left out.
+std::string ourReading(const std::string& technology, Bytes message) {
+    const std::string name = technology + "\t";
+    const auto header = recordHeader(message);
+    if (technology == "IFX")
+        return name + "\t\t\t\t\t\t\t" + lowerHex(message);
+    if (!header)
+        return name + "\t\t\t\t\t\t\t";
+    const bool anyType = technology == "Ostrel_CDMA";
+    const bool known = header->type == RecordHeader::basebandType || header->type == RecordHeader::extraType;
+    std::string sections;
+    if (known)
+        for (const std::string& section : sectionsWanting(technology, header->logCode()))
+            sections += (sections.empty() ? "" : ";") + section;
+    const auto time = header->timestamp ? timeOfRecord(*header->timestamp) : std::nullopt;
+    const std::size_t begin = std::min(RecordHeader::size, header->record.size());
+    return name + (header->prefixed ? lowerHex(message.first(RecordHeader::prefixSize)) : "") + "\t" +
+           formatted("0x%02x", static_cast<unsigned>(header->type)) + "\t" + std::to_string(header->length) +
+           "\t" + (known || anyType ? formatted("0x%06x", static_cast<unsigned>(header->logCode())) : "") +
+           "\t" + sections + "\t" + (anyType ? recordName(header->logCode()) : "") + "\t" +
+           (time ? momentText(*time) : "") + "\t" + lowerHex(header->record.subspan(begin));
+}
+
+const std::vector<std::string_view> ourFields = {
+    "velmora.technology", "velmora.prefix", "velmora.type", "velmora.length",  "velmora.code",
+    "velmora.sections",   "velmora.record", "velmora.time", "velmora.payload",
+};
+
+class Dissector : public testing::Test {
+protected:
+    void SetUp() override { NEEDS_PROGRAM("tshark"); }
+
+    /// A capture of such messages.
+    [[nodiscard]] std::string capture(const std::vector<Data>& messages,
+                                      std::string_view technology = "Ostrel_GSM") const {
+        const std::string path = _directory / "a.pcapng";
+        writeCapture(path, technology, messages);
+        return path;
+    }
+
+    TemporaryDirectory _directory;
+};
+
+TEST_F(Dissector, agreesOnEveryMessageOfTheRecordings) {
+    for (const ExampleRecording& recording : exampleRecordings()) {
+        const std::string path = VELMORA_SOURCE_DIR "/Tests/Recordings/" + recording.fileName();
+        const auto reader = openMessages(path);
+        ASSERT_TRUE(reader) << reader.reason();
+        std::vector<std::string> wanted;
+        while (const auto message = (*reader)->next())
+            wanted.push_back(ourReading((*reader)->technology(), message->message.bytes()));
+        const std::vector<std::string> found = dissectedFields(path, ourFields);
+        ASSERT_EQ(found.size(), wanted.size()) << path;
+        ASSERT_GT(found.size(), 50U);
+        for (std::size_t i = 0; i < found.size(); ++i)
+            EXPECT_EQ(found[i], wanted[i]) << "message " << i + 1 << " of " << path;
+    }
+}
+
+/// The code and the sections of each message, as velmora-log tells of it.
+TEST_F(Dissector, agreesWithTheCommandLine) {
+    for (const ExampleRecording& recording : exampleRecordings()) {
+        const std::string path = VELMORA_SOURCE_DIR "/Tests/Recordings/" + recording.fileName();
+        const ShellOutcome outcome =
+            runShell("VELMORA_RESOURCES=" + shellQuoted(VELMORA_SOURCE_DIR "/Resources") + " " +
+                     shellQuoted(VELMORA_BUILD_DIR "/velmora-log") +
+                     " decode --format jsonl --every message " + shellQuoted(path));
+        ASSERT_EQ(outcome.status, 0);
+        std::istringstream lines(outcome.output);
+        std::vector<std::string> wanted;
+        for (std::string line; std::getline(lines, line);) {
+            const auto message = nlohmann::ordered_json::parse(line);
+            std::string text;
+            if (const auto code = message.find("code"); code != message.end() && code->is_number())
+                text = formatted("0x%06x", code->get<unsigned>());
+            text += "\t";
+            bool first = true;
+            if (const auto sections = message.find("sections"); sections != message.end())
+                for (const auto& [name, node] : sections->items()) {
+                    text += (first ? "" : ";") + name;
+                    first = false;
+                }
+            wanted.push_back(text);
+        }
+        EXPECT_EQ(dissectedFields(path, {"velmora.code", "velmora.sections"}), wanted) << path;
+    }
+}
+
+struct TimeRow {
+    const char* what;
+    const char* stamp; ///< the record's bytes 5 to 12
+    const char* shown;
+};
+const TimeRow timeRows[] = {
+    {"beginning", "0000 000000000000", "Jan  6, 1980 00:00:00.000000000 UTC"},
+    // 384 parts, 32 a chip of 813.8 ns.
+    {"12 chips", "8001 000000000000", "Jan  6, 1980 00:00:00.000009766 UTC"},
+    {"one unit", "0000 010000000000", "Jan  6, 1980 00:00:00.001250000 UTC"},
+    {"last part of a second", "FFBF 1F0300000000", "Jan  6, 1980 00:00:00.999999975 UTC"},
+    // The first leap second was inserted 542 days after the beginning: 46828800 s, of 800 units each.
+    {"before a leap second", "0000 FF9FF8B80800", "Jun 30, 1981 23:59:59.998750000 UTC"},
+    {"within a leap second", "0000 00A0F8B80800", "Jul  1, 1981 00:00:00.000000000 UTC"},
+    {"after a leap second", "0000 20A3F8B80800", "Jul  1, 1981 00:00:00.000000000 UTC"},
+};
+
+TEST_F(Dissector, showsTimeStamps) {
+    std::vector<Data> messages;
+    for (const TimeRow& row : timeRows)
+        messages.push_back(joined(hex("01 0C00 2C51"), hex(row.stamp)));
+    const std::vector<std::string> found = dissectedFields(capture(messages), {"velmora.time"});
+    ASSERT_EQ(found.size(), std::size(timeRows));
+    for (std::size_t i = 0; i < found.size(); ++i)
+        EXPECT_EQ(found[i], timeRows[i].shown) << timeRows[i].what;
+}
+
+struct OddRow {
+    const char* what;
+    const char* message;
+    const char* expert;
+    const char* info;
+};
+const OddRow oddRows[] = {
+    {"good", "01 0C00 2C51 0000000000000000", "", "0x512C  GSM RR Info  0 bytes"},
+    {"extra stream", "FF 0D00 0100 0000000000000000 77", "",
+     "0xFF0001  GSM Serving Cell, Neighboring Cells, Serving PLMN, UMTS Set, UMTS RR Info  1 bytes"},
+    {"nobody's code", "01 0C00 7513 0000000000000000", "", "0x1375  0 bytes"},
+    {"empty", "", "Message is too short: 0 bytes, wanted at least 13", "Empty"},
+    {"12 bytes", "01 0C00 2C51 00000000000000", "Message is too short: 12 bytes, wanted at least 13",
+     "Too short: 12 bytes, wanted at least 13"},
+    {"prefixed", "8100 01 0C00 2C51 0000000000000000", "", "0x512C  GSM RR Info  0 bytes, prefixed"},
+    // As decoders do, the length is looked at before the prefix is taken away.
+    {"prefixed, 13 bytes in all", "8100 01 0C00 2C51 000000000000",
+     "Length is not the record's: 12, 10 bytes follow the type;"
+     "Record ends within its time stamp: 11 bytes, wanted at least 13",
+     "0x512C  GSM RR Info  0 bytes, prefixed"},
+    {"type 2", "02 0C00 2C51 0000000000000000", "Type is neither stream's: 0x02, wanted 0x01 or 0xff",
+     "0x512C  [type 0x02]  0 bytes"},
+    {"length", "01 0F00 2C51 0000000000000000 99", "Length is not the record's: 15, 13 bytes follow the type",
+     "0x512C  GSM RR Info  1 bytes"},
+    {"chips past their unit", "01 0C00 2C51 00C0 000000000000",
+     "Time stamp is out of range: 0 units of 1.25 ms and 49152 of 49152 parts",
+     "0x512C  GSM RR Info  0 bytes"},
+    {"time past the year 2262", "01 0C00 2C51 0000 FFFFFFFFFFFF",
+     "Time stamp is out of range: 281474976710655 units of 1.25 ms and 0 of 49152 parts",
+     "0x512C  GSM RR Info  0 bytes"},
+};
+
+TEST_F(Dissector, tellsWhatIsOdd) {
+    std::vector<Data> messages;
+    for (const OddRow& row : oddRows)
+        messages.push_back(hex(row.message));
+    const std::string path = capture(messages);
+    const std::vector<std::string> found =
+        dissectedFields(path, {"_ws.expert.message", "_ws.col.Info", "_ws.col.Protocol"});
+    ASSERT_EQ(found.size(), std::size(oddRows));
+    for (std::size_t i = 0; i < found.size(); ++i)
+        EXPECT_EQ(found[i], std::string(oddRows[i].expert) + "\t" + oddRows[i].info + "\tOstrel_GSM")
+            << oddRows[i].what;
+}
+
+TEST_F(Dissector, tellsOfMessagesThatWereCutWhenTheyWereCaptured) {
+    NEEDS_PROGRAM("editcap");
+    const std::string path = capture({hex("01 0C00 2C51 0000000000000000 01020304")});
+    const std::string cut = _directory / "cut.pcapng";
+    ASSERT_EQ(runShell("editcap -s 15 " + path + " " + cut).status, 0);
+    const std::vector<std::string> found = dissectedFields(cut, {"velmora.payload", "_ws.expert.message"});
+    EXPECT_THAT(found, ElementsAre(HasSubstr("Message was cut when it was captured: 15 of 17 bytes")));
+    EXPECT_THAT(found, ElementsAre(HasSubstr("0102\t")));
+}
+
+TEST_F(Dissector, servesDisplayFilters) {
+    const std::string path = VELMORA_SOURCE_DIR "/Tests/Recordings/lte.pcapng";
+    const auto count = [&](const std::string& filter) {
+        return dissected(path, "-Y " + shellQuoted(filter)).size();
+    };
+    const auto reader = openMessages(path);
+    ASSERT_TRUE(reader) << reader.reason();
+    std::size_t neighbours = 0;
+    std::size_t sim = 0;
+    std::size_t tooShort = 0;
+    while (const auto message = (*reader)->next()) {
+        const auto header = recordHeader(message->message.bytes());
+        tooShort += header ? 0U : 1U;
+        neighbours += header && header->logCode() == 0xB180 ? 1U : 0U;
+        sim += header && header->logCode() == 0xFF0000 ? 1U : 0U;
+    }
+    ASSERT_GT(neighbours, 0U);
+    ASSERT_GT(sim, 0U);
+    ASSERT_GT(tooShort, 0U);
+    EXPECT_EQ(count("velmora.code == 0xb180"), neighbours);
+    EXPECT_EQ(count("velmora.sections == \"Neighbor Cells List\""), neighbours);
+    EXPECT_EQ(count("velmora.sections contains \"SIM\""), sim);
+    EXPECT_EQ(count("velmora.too_short"), tooShort);
+    EXPECT_EQ(count("velmora.technology != \"Ostrel_LTE\""), 0U);
+}
+
+TEST_F(Dissector, isLoadedFromTheDirectoryOfLuaPlugins) {
+    const std::filesystem::path plugins = _directory / ".local/lib/wireshark/plugins";
+    std::filesystem::create_directories(plugins);
+    std::filesystem::copy_file(VELMORA_SOURCE_DIR "/Resources/wireshark/velmora.lua",
+                               plugins / "velmora.lua");
+    const ShellOutcome outcome =
+        runShell("HOME=" + shellQuoted(_directory.path()) + " tshark -r " +
+                 capture({hex("01 0C00 2C51 0000000000000000")}) + " -T fields -e velmora.code");
+    EXPECT_EQ(outcome.output, "0x00512c\n");
+}
+
+/// Every prefix of a good message, and every one of its bytes turned over: `dissected` expects the dissector
+/// to bear it.
+TEST_F(Dissector, bearsWhateverItIsGiven) {
+    const Data good = hex("8100 FF 2E00 0000 0000000000000000 62706C6973743030 D1 01 02 51 61 51 62 08 0B 0D"
+                          "000000000000 01 01 0000000000000003 0000000000000000 000000000000000F");
+    std::vector<Data> messages;
+    for (std::size_t size = 0; size <= good.size(); ++size)
+        messages.push_back(Data::copyOf(good.bytes().first(size)));
+    for (std::size_t i = 0; i < good.size(); ++i)
+        for (const unsigned mask : {0x01U, 0x80U, 0xFFU}) {
+            std::vector<std::uint8_t> bytes(good.bytes().begin(), good.bytes().end());
+            bytes[i] = static_cast<std::uint8_t>(bytes[i] ^ mask);
+            messages.emplace_back(std::move(bytes));
+        }
+    EXPECT_EQ(dissectedFields(capture(messages), {"frame.number"}).size(), messages.size());
+    EXPECT_EQ(dissectedFields(capture(messages, "IFX"), {"frame.number"}).size(), messages.size());
+    EXPECT_THAT(dissected(capture(messages), "-V"), Each(Not(HasSubstr("exception"))));
+}
+
+} // namespace
+} // namespace velmora
