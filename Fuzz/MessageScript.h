@@ -1,0 +1,48 @@
+#pragma once
+
+#include "Platform/Bytes.h"
+
+#include <cstdint>
+#include <optional>
+#include <vector>
+
+namespace velmora {
+
+/// What an input has a decoder do, step after step. Any bytes are a script: a step begins with a byte whose
+/// remainder by 6 tells its kind, and what is cut off by the script's end is taken as far as it goes.
+///
+///     0  a record of the baseband's stream: u16 log code, u16 payload length, payload
+///     1  one of the telephony service's extra stream, likewise
+///     2  as 0, behind the prefix 81 00
+///     3  a message as it stands: u16 length, bytes
+///     4  a redraw
+///     5  a reconnection: another decoder goes on with the same state
+///
+/// Numbers are little-endian. A record's header tells its length and has no time stamp.
+class MessageScript {
+public:
+    enum class Kind : std::uint8_t { Message, Redraw, Reconnect };
+    struct Step {
+        Kind kind = Kind::Message;
+        Data message;
+    };
+
+    explicit MessageScript(Bytes script) : _rest(script) {}
+
+    /// The next step; none at the end.
+    [[nodiscard]] std::optional<Step> next();
+
+    /// A step as the script has it. The time stamp of a message that is a record goes, and its length field
+    /// becomes right. Precondition: the message has at most 65535 bytes.
+    [[nodiscard]] static std::vector<std::uint8_t> encode(const Step& step);
+
+private:
+    std::uint8_t takeByte();
+    std::uint16_t takeU16();
+    /// A u16 length and as many bytes.
+    Bytes takeBytes();
+
+    Bytes _rest;
+};
+
+} // namespace velmora

@@ -1,0 +1,59 @@
+#include "Fuzz/FuzzTargets.h"
+#include "Fuzz/SameValue.h"
+#include "Platform/PropertyList.h"
+
+#include <string>
+
+namespace velmora {
+
+namespace {
+
+Bytes bytesOf(const std::string& text) {
+    return {reinterpret_cast<const std::uint8_t*>(text.data()), text.size()};
+}
+
+/// The input is a property list of either form. What was read is written in both forms and read back.
+class PropertyListTarget final : public FuzzTarget {
+public:
+    void run(Bytes input) override {
+        const auto value = readPropertyList(input);
+        expectBounded(input, value);
+        if (!value) {
+            require(!value.reason().empty(), "a list that is refused has a reason");
+            return;
+        }
+        const auto binary = writeBinaryPropertyList(*value);
+        require(static_cast<bool>(binary), "every list that was read can be written in the binary form");
+        const auto again = readPropertyList(*binary);
+        require(again && sameValue(*again, *value), "the binary form gives the same value");
+
+        // The XML form has no control characters; then, and only then, it is refused.
+        const auto xml = writeXMLPropertyList(*value);
+        if (!xml) {
+            require(xml.reason().starts_with("a string holds what XML cannot carry"),
+                    "only its characters keep a list that was read from the XML form");
+            return;
+        }
+        const auto back = readPropertyList(bytesOf(*xml));
+        require(static_cast<bool>(back), "the XML form can be read");
+        const auto xmlAgain = writeXMLPropertyList(*back);
+        require(xmlAgain && *xmlAgain == *xml, "the XML form gives the same value");
+    }
+
+private:
+    /// Narrower limits refuse a list or change nothing.
+    static void expectBounded(Bytes input, const Result<Value>& value) {
+        constexpr PropertyListLimits narrow{4, 40, 1200};
+        const auto bounded = readPropertyList(input, narrow);
+        if (bounded)
+            require(value && sameValue(*bounded, *value), "limits do not change what is read");
+    }
+};
+
+} // namespace
+
+std::unique_ptr<FuzzTarget> makePropertyListTarget() {
+    return std::make_unique<PropertyListTarget>();
+}
+
+} // namespace velmora

@@ -1,0 +1,31 @@
+#pragma once
+
+#include "Platform/SystemLog.h"
+
+#include <cstdio>
+
+namespace velmora {
+
+/// For as long as it lives, the process's log lines of error priority are composed, since they show what the
+/// input holds, and go nowhere, as does what classes print on the console. Main thread only.
+class QuietProcess {
+public:
+    QuietProcess();
+    ~QuietProcess();
+    QuietProcess(const QuietProcess&) = delete;
+    QuietProcess& operator=(const QuietProcess&) = delete;
+
+private:
+    class NullLog final : public SystemLog {
+    public:
+        void write(int, std::string_view) override {}
+    };
+
+    NullLog _log;
+    int _earlierLevel;
+    SystemLog* _earlierLog;
+    std::FILE* _console;
+    std::FILE* _earlierConsole;
+};
+
+} // namespace velmora
