@@ -30,9 +30,13 @@ void logFormat(int priority, const char* format, ...) {
     va_start(arguments, format);
     std::va_list again;
     va_copy(again, arguments);
-    const int length = std::vsnprintf(nullptr, 0, format, arguments);
+    // Nearly every line fits; one that does not is formatted again.
+    char usual[256];
+    const int length = std::vsnprintf(usual, sizeof usual, format, arguments);
     va_end(arguments);
-    if (length >= 0) {
+    if (length >= 0 && static_cast<std::size_t>(length) < sizeof usual) {
+        detail::writeToSystemLog(priority, {usual, static_cast<std::size_t>(length)});
+    } else if (length >= 0) {
         std::string text(static_cast<std::size_t>(length), '\0');
         std::vsnprintf(text.data(), text.size() + 1, format, again);
         detail::writeToSystemLog(priority, text);

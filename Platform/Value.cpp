@@ -2,20 +2,9 @@
 
 #include <algorithm>
 #include <stdexcept>
+#include <utility>
 
 namespace velmora {
-
-namespace {
-
-/// Below this many entries comparing keys one by one beats hashing them.
-constexpr std::size_t indexedFrom = 17;
-
-const Value& noValue() {
-    static const Value none;
-    return none;
-}
-
-} // namespace
 
 std::string_view nameOf(Value::Kind kind) {
     switch (kind) {
@@ -64,29 +53,28 @@ DictionaryRef Value::dictionaryRef() const {
 }
 
 Value Value::copy() const {
-    if (const Array* array = asArray()) {
-        // What is frozen holds nothing that can change, so a copy of a copy is the copy itself.
-        if (array->_frozen)
-            return *this;
-        auto result = makeArray();
-        result->_values.reserve(array->size());
-        for (const Value& value : *array)
-            result->_values.push_back(value.copy());
-        result->_frozen = true;
-        return result;
-    }
-    if (const Dictionary* dictionary = asDictionary()) {
-        if (dictionary->_frozen)
-            return *this;
-        auto result = makeDictionary();
-        result->_entries.reserve(dictionary->size());
-        for (const Dictionary::Entry& entry : *dictionary)
-            result->_entries.push_back({entry.key, entry.value.copy()});
-        result->rebuildIndex();
-        result->_frozen = true;
-        return result;
-    }
+    // What is frozen holds nothing that can change, so a copy of a copy is the copy itself.
+    if (const Array* array = asArray())
+        return array->_frozen ? *this : Value(array->frozenCopy());
+    if (const Dictionary* dictionary = asDictionary())
+        return dictionary->_frozen ? *this : Value(dictionary->frozenCopy());
     return *this;
+}
+
+void Value::assignCopy(const Value& other) {
+    if (const std::string* text = other.asString())
+        setText(*text);
+    else
+        *this = other.copy();
+}
+
+bool Value::isCopyOf(const Value& other) const {
+    if (!other.isNode())
+        return true; // whatever changes a scalar is a change of its node
+    if (const Array* array = other.asArray())
+        return asArray() == (array->_frozen ? array : array->frozenCopy().get());
+    const Dictionary* dictionary = other.asDictionary();
+    return asDictionary() == (dictionary->_frozen ? dictionary : dictionary->frozenCopy().get());
 }
 
 void Value::setText(std::string_view text) {
@@ -118,94 +106,85 @@ bool operator==(const Value& a, const Value& b) {
 
 void Array::append(Value value) {
     expectMutable();
+    static_cast<void>(written());
     _values.push_back(std::move(value));
+    ++_changes;
 }
 
 void Array::clear() {
     expectMutable();
+    _later.turn = 0;
     _values.clear();
+    ++_changes;
 }
 
 void Array::removeFirst(std::size_t count) {
     expectMutable();
+    static_cast<void>(written());
     _values.erase(_values.begin(),
                   _values.begin() + static_cast<std::ptrdiff_t>(std::min(count, _values.size())));
+    ++_changes;
+}
+
+void Array::writeLater(const Writing<Array>& writing, Bytes bytes) {
+    expectMutable();
+    _later.ask(writing, bytes, ++_changes);
+}
+
+void Array::writeNow() const {
+    // What is observed does not change, only how it is held. No node is a constant object.
+    auto& self = const_cast<Array&>(*this);
+    const std::uint64_t changes = _changes;
+    const std::uint64_t turn = std::exchange(self._later.turn, 0);
+    const bool frozen = std::exchange(self._frozen, false);
+    self._values.clear();
+    try {
+        _later.writing.write(self, _later.bytes, _later.writing.table);
+        if (frozen)
+            for (Value& value : self._values)
+                value = value.copy();
+    } catch (...) {
+        self._later.turn = turn; // memory was short: it stays to be written
+        self._frozen = frozen;
+        throw;
+    }
+    self._frozen = frozen;
+    _copies.renumber(changes, _changes);
+}
+
+ArrayRef Array::frozenCopy() const {
+    if (const ArrayRef& latest = _copies.latest(_changes); latest && isCopy(*latest))
+        return latest;
+    const ArrayRef& copy = _copies.next();
+    copy->becomeCopyOf(*this);
+    _copies.finish(_changes);
+    return copy;
+}
+
+/// Whether the copy that was made after the array's last change of its own still shows what is in it.
+bool Array::isCopy(const Array& copy) const {
+    if (_later.isDue())
+        return true;
+    return !copy._later.isDue() &&
+           std::equal(_values.begin(), _values.end(), copy._values.begin(), copy._values.end(),
+                      [](const Value& value, const Value& copied) { return copied.isCopyOf(value); });
+}
+
+void Array::becomeCopyOf(const Array& source) {
+    if (source._later.isDue()) {
+        _later.ask(source._later.writing, source._later.bytes, source._later.turn);
+    } else {
+        _later.turn = 0;
+        _values.resize(source._values.size());
+        for (std::size_t i = 0; i < _values.size(); ++i)
+            _values[i].assignCopy(source._values[i]);
+    }
+    _frozen = true;
 }
 
 void Array::expectMutable() const {
     if (_frozen)
         throw std::logic_error("a frozen array cannot be changed");
-}
-
-Dictionary::Dictionary(std::initializer_list<Entry> entries) {
-    for (const Entry& entry : entries)
-        set(entry.key, entry.value);
-}
-
-std::optional<std::size_t> Dictionary::indexOf(std::string_view key) const {
-    if (!_index.empty()) {
-        const auto found = _index.find(key);
-        if (found == _index.end())
-            return std::nullopt;
-        return found->second;
-    }
-    for (std::size_t i = 0; i < _entries.size(); ++i)
-        if (_entries[i].key == key)
-            return i;
-    return std::nullopt;
-}
-
-const Value* Dictionary::find(std::string_view key) const {
-    const auto index = indexOf(key);
-    return index ? &_entries[*index].value : nullptr;
-}
-
-const Value& Dictionary::operator[](std::string_view key) const {
-    const Value* value = find(key);
-    return value ? *value : noValue();
-}
-
-Value& Dictionary::slot(std::string_view key) {
-    expectMutable();
-    if (const auto index = indexOf(key))
-        return _entries[*index].value;
-    _entries.push_back({std::string(key), Value()});
-    if (!_index.empty())
-        _index.emplace(key, _entries.size() - 1);
-    else if (_entries.size() >= indexedFrom)
-        rebuildIndex();
-    return _entries.back().value;
-}
-
-void Dictionary::set(std::string_view key, Value value) {
-    slot(key) = std::move(value);
-}
-
-void Dictionary::setText(std::string_view key, std::string_view text) {
-    slot(key).setText(text);
-}
-
-bool Dictionary::remove(std::string_view key) {
-    expectMutable();
-    const auto index = indexOf(key);
-    if (!index)
-        return false;
-    _entries.erase(_entries.begin() + static_cast<std::ptrdiff_t>(*index));
-    rebuildIndex();
-    return true;
-}
-
-void Dictionary::rebuildIndex() {
-    _index.clear();
-    if (_entries.size() < indexedFrom)
-        return;
-    for (std::size_t i = 0; i < _entries.size(); ++i)
-        _index.emplace(_entries[i].key, i);
-}
-
-void Dictionary::expectMutable() const {
-    if (_frozen)
-        throw std::logic_error("a frozen dictionary cannot be changed");
 }
 
 } // namespace velmora

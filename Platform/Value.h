@@ -1,6 +1,8 @@
 #pragma once
 
 #include "Platform/Bytes.h"
+#include "Platform/FrozenCopies.h"
+#include "Platform/LaterWriting.h"
 
 #include <chrono>
 #include <concepts>
@@ -66,7 +68,8 @@ public:
     [[nodiscard]] ArrayRef arrayRef() const;
     [[nodiscard]] DictionaryRef dictionaryRef() const;
 
-    /// An independent, deep, frozen copy. Strings are copied, data is shared (it cannot change).
+    /// An independent, deep, frozen copy. Strings are copied, data is shared (it cannot change), and so are
+    /// the copies of nodes that have not changed since their last one.
     [[nodiscard]] Value copy() const;
 
     /// Makes this a string with the given text; a string that is there already keeps its storage.
@@ -76,6 +79,14 @@ public:
     friend bool operator==(const Value& a, const Value& b);
 
 private:
+    friend class Array;
+    friend class Dictionary;
+    [[nodiscard]] bool isNode() const { return kind() >= Kind::Array; }
+    /// Becomes a copy of the other, in the storage that is there.
+    void assignCopy(const Value& other);
+    /// Whether that would change nothing.
+    [[nodiscard]] bool isCopyOf(const Value& other) const;
+
     std::variant<std::monostate, std::string, std::int64_t, double, bool, Date, Data, ArrayRef, DictionaryRef>
         _held;
 };
@@ -90,26 +101,41 @@ public:
     Array() = default;
     Array(std::initializer_list<Value> values) : _values(values) {}
 
-    [[nodiscard]] std::size_t size() const { return _values.size(); }
-    [[nodiscard]] bool empty() const { return _values.empty(); }
+    [[nodiscard]] std::size_t size() const { return written().size(); }
+    [[nodiscard]] bool empty() const { return written().empty(); }
     /// Precondition: index < size().
-    [[nodiscard]] const Value& operator[](std::size_t index) const { return _values[index]; }
-    [[nodiscard]] auto begin() const { return _values.begin(); }
-    [[nodiscard]] auto end() const { return _values.end(); }
+    [[nodiscard]] const Value& operator[](std::size_t index) const { return written()[index]; }
+    [[nodiscard]] auto begin() const { return written().begin(); }
+    [[nodiscard]] auto end() const { return written().end(); }
 
     void append(Value value);
     void clear();
     /// Removes the first `count` values (all of them where there are fewer).
     void removeFirst(std::size_t count);
     void reserve(std::size_t count) { _values.reserve(count); }
+    /// Has the elements made of the bytes, in place of those that are there, when somebody looks for them.
+    void writeLater(const Writing<Array>& writing, Bytes bytes);
 
     [[nodiscard]] bool isFrozen() const { return _frozen; }
 
 private:
     friend class Value;
+    /// The elements, after what was to be written later has been.
+    const std::vector<Value>& written() const {
+        if (_later.isDue())
+            writeNow();
+        return _values;
+    }
+    void writeNow() const;
+    [[nodiscard]] ArrayRef frozenCopy() const;
+    [[nodiscard]] bool isCopy(const Array& copy) const;
+    void becomeCopyOf(const Array& source);
     void expectMutable() const;
 
     std::vector<Value> _values;
+    LaterWriting<Array> _later;
+    std::uint64_t _changes = 0; ///< counts every change
+    mutable FrozenCopies<Array> _copies;
     bool _frozen = false;
 };
 
@@ -129,12 +155,12 @@ public:
 
     [[nodiscard]] std::size_t size() const { return _entries.size(); }
     [[nodiscard]] bool empty() const { return _entries.empty(); }
-    [[nodiscard]] auto begin() const { return _entries.begin(); }
-    [[nodiscard]] auto end() const { return _entries.end(); }
+    [[nodiscard]] auto begin() const { return written().begin(); }
+    [[nodiscard]] auto end() const { return written().end(); }
 
     /// The value under `key`, or null. Valid until the dictionary is changed.
     [[nodiscard]] const Value* find(std::string_view key) const;
-    [[nodiscard]] bool contains(std::string_view key) const { return find(key) != nullptr; }
+    [[nodiscard]] bool contains(std::string_view key) const { return indexOf(key).has_value(); }
     /// The value under `key`, or none.
     [[nodiscard]] const Value& operator[](std::string_view key) const;
 
@@ -144,6 +170,9 @@ public:
     void setText(std::string_view key, std::string_view text);
     /// Whether there was such a key.
     bool remove(std::string_view key);
+    /// Has the bytes written, as all that is set before and after would have it, when somebody looks for
+    /// values. The first time, when the keys may not be there yet, they are written at once.
+    void writeLater(const Writing<Dictionary>& writing, Bytes bytes);
 
     [[nodiscard]] bool isFrozen() const { return _frozen; }
 
@@ -153,7 +182,21 @@ private:
         using is_transparent = void;
         std::size_t operator()(std::string_view key) const { return std::hash<std::string_view>{}(key); }
     };
+    static constexpr std::uint64_t neverChanged = ~std::uint64_t{0};
+    struct Later : LaterWriting<Dictionary> {
+        bool hasKeys = false; ///< all its keys have been set and none has been removed
+    };
 
+    /// The entries, after what was to be written later has been.
+    const std::vector<Entry>& written() const {
+        if (_due)
+            writeNow();
+        return _entries;
+    }
+    void writeNow() const;
+    [[nodiscard]] DictionaryRef frozenCopy() const;
+    [[nodiscard]] bool isCopy(const Dictionary& copy) const;
+    void becomeCopyOf(const Dictionary& source);
     [[nodiscard]] std::optional<std::size_t> indexOf(std::string_view key) const;
     Value& slot(std::string_view key);
     void rebuildIndex();
@@ -162,7 +205,16 @@ private:
     std::vector<Entry> _entries;
     /// Key to place in `_entries`; empty while there are few entries.
     std::unordered_map<std::string, std::size_t, Hash, std::equal_to<>> _index;
+    std::vector<Later> _later;
+    bool _due = false;        ///< some of them are to be written yet
+    bool _holdsNodes = false; ///< an array or dictionary has been set at some time
     bool _frozen = false;
+    std::uint64_t _changes = 0;                  ///< counts every change
+    std::uint64_t _entriesChanged = 0;           ///< what it was when the entries last changed
+    std::uint64_t _keysChanged = 0;              ///< what it was when the keys last changed
+    std::uint64_t _copiedEntries = neverChanged; ///< in a frozen copy: the source's `_entriesChanged`
+    std::uint64_t _copiedKeys = neverChanged;    ///< in a frozen copy: the source's `_keysChanged`
+    mutable FrozenCopies<Dictionary> _copies;
 };
 
 [[nodiscard]] inline ArrayRef makeArray() {

@@ -7,18 +7,37 @@ namespace velmora {
 
 namespace {
 
+void appendTwoDigits(std::string& text, unsigned number) {
+    text += static_cast<char>('0' + number / 10);
+    text += static_cast<char>('0' + number % 10);
+}
+
 /// "2026-11-16" + separator + "05:00:00", of the seconds as they stand.
 std::string format(std::chrono::sys_seconds moment, const char* separator) {
     const auto day = std::chrono::floor<std::chrono::days>(moment);
     const std::chrono::year_month_day date(day);
     const std::chrono::hh_mm_ss time(moment - day);
-    char dateText[32];
-    std::snprintf(dateText, sizeof dateText, "%04d-%02u-%02u", static_cast<int>(date.year()),
-                  static_cast<unsigned>(date.month()), static_cast<unsigned>(date.day()));
-    char timeText[32];
-    std::snprintf(timeText, sizeof timeText, "%02d:%02d:%02d", static_cast<int>(time.hours().count()),
-                  static_cast<int>(time.minutes().count()), static_cast<int>(time.seconds().count()));
-    return std::string(dateText) + separator + timeText;
+    std::string text;
+    text.reserve(48);
+    if (const int year = static_cast<int>(date.year()); year >= 0 && year <= 9999) {
+        appendTwoDigits(text, static_cast<unsigned>(year) / 100);
+        appendTwoDigits(text, static_cast<unsigned>(year) % 100);
+    } else {
+        char yearText[16];
+        std::snprintf(yearText, sizeof yearText, "%04d", year);
+        text += yearText;
+    }
+    text += '-';
+    appendTwoDigits(text, static_cast<unsigned>(date.month()));
+    text += '-';
+    appendTwoDigits(text, static_cast<unsigned>(date.day()));
+    text += separator;
+    appendTwoDigits(text, static_cast<unsigned>(time.hours().count()));
+    text += ':';
+    appendTwoDigits(text, static_cast<unsigned>(time.minutes().count()));
+    text += ':';
+    appendTwoDigits(text, static_cast<unsigned>(time.seconds().count()));
+    return text;
 }
 
 } // namespace

@@ -1,0 +1,197 @@
+#include "Platform/Value.h"
+
+#include <algorithm>
+#include <stdexcept>
+#include <utility>
+
+namespace velmora {
+
+namespace {
+
+/// Below this many entries comparing keys one by one beats hashing them.
+constexpr std::size_t indexedFrom = 17;
+
+const Value& noValue() {
+    static const Value none;
+    return none;
+}
+
+} // namespace
+
+Dictionary::Dictionary(std::initializer_list<Entry> entries) {
+    for (const Entry& entry : entries)
+        set(entry.key, entry.value);
+}
+
+std::optional<std::size_t> Dictionary::indexOf(std::string_view key) const {
+    if (!_index.empty()) {
+        const auto found = _index.find(key);
+        if (found == _index.end())
+            return std::nullopt;
+        return found->second;
+    }
+    for (std::size_t i = 0; i < _entries.size(); ++i)
+        if (_entries[i].key == key)
+            return i;
+    return std::nullopt;
+}
+
+const Value* Dictionary::find(std::string_view key) const {
+    const auto index = indexOf(key);
+    return index ? &written()[*index].value : nullptr;
+}
+
+const Value& Dictionary::operator[](std::string_view key) const {
+    const Value* value = find(key);
+    return value ? *value : noValue();
+}
+
+/// The value under the key, which is there afterwards.
+Value& Dictionary::slot(std::string_view key) {
+    expectMutable();
+    static_cast<void>(written());
+    if (const auto index = indexOf(key))
+        return _entries[*index].value;
+    _entries.push_back({std::string(key), Value()});
+    _keysChanged = ++_changes;
+    if (!_index.empty())
+        _index.emplace(key, _entries.size() - 1);
+    else if (_entries.size() >= indexedFrom)
+        rebuildIndex();
+    return _entries.back().value;
+}
+
+void Dictionary::set(std::string_view key, Value value) {
+    _holdsNodes = _holdsNodes || value.isNode();
+    slot(key) = std::move(value);
+    _entriesChanged = ++_changes;
+}
+
+void Dictionary::setText(std::string_view key, std::string_view text) {
+    Value& value = slot(key);
+    if (const std::string* present = value.asString(); present && *present == text)
+        return;
+    value.setText(text);
+    _entriesChanged = ++_changes;
+}
+
+bool Dictionary::remove(std::string_view key) {
+    expectMutable();
+    const auto index = indexOf(key);
+    if (!index)
+        return false;
+    static_cast<void>(written());
+    _entries.erase(_entries.begin() + static_cast<std::ptrdiff_t>(*index));
+    rebuildIndex();
+    for (Later& later : _later)
+        later.hasKeys = false;
+    _keysChanged = _entriesChanged = ++_changes;
+    return true;
+}
+
+void Dictionary::writeLater(const Writing<Dictionary>& writing, Bytes bytes) {
+    expectMutable();
+    auto later = std::find_if(_later.begin(), _later.end(),
+                              [&writing](const Later& known) { return known.writing == writing; });
+    if (later != _later.end() && later->hasKeys) {
+        // What the writing was asked to write before is written over, wherever in the order that stood.
+        later->ask(writing, bytes, ++_changes);
+        _due = true;
+        return;
+    }
+    static_cast<void>(written());
+    writing.write(*this, bytes, writing.table);
+    if (later == _later.end())
+        later = _later.insert(later, Later{{writing, {}, 0}, false});
+    later->hasKeys = true;
+}
+
+void Dictionary::writeNow() const {
+    // What is observed does not change, only how it is held. No node is a constant object.
+    auto& self = const_cast<Dictionary&>(*this);
+    const bool frozen = std::exchange(self._frozen, false);
+    const std::uint64_t changes = _changes;
+    self._due = false;
+    const auto isEarlier = [](const Later& a, const Later& b) { return a.turn - 1 < b.turn - 1; };
+    try {
+        for (;;) {
+            // Those that have been written come last.
+            const auto next = std::min_element(self._later.begin(), self._later.end(), isEarlier);
+            if (!next->isDue())
+                break;
+            next->writing.write(self, next->bytes, next->writing.table);
+            next->turn = 0;
+        }
+        if (frozen)
+            for (Entry& entry : self._entries)
+                if (entry.value.isNode())
+                    entry.value = entry.value.copy();
+    } catch (...) {
+        self._due = true; // memory was short: it stays to be written
+        self._frozen = frozen;
+        throw;
+    }
+    self._frozen = frozen;
+    self._copiedEntries = neverChanged;
+    _copies.renumber(changes, _changes);
+}
+
+DictionaryRef Dictionary::frozenCopy() const {
+    if (const DictionaryRef& latest = _copies.latest(_changes); latest && isCopy(*latest))
+        return latest;
+    const DictionaryRef& copy = _copies.next();
+    copy->becomeCopyOf(*this);
+    _copies.finish(_changes);
+    return copy;
+}
+
+/// As for an array.
+bool Dictionary::isCopy(const Dictionary& copy) const {
+    return !_holdsNodes || std::equal(_entries.begin(), _entries.end(), copy._entries.begin(),
+                                      copy._entries.end(), [](const Entry& entry, const Entry& other) {
+                                          return other.value.isCopyOf(entry.value);
+                                      });
+}
+
+void Dictionary::becomeCopyOf(const Dictionary& source) {
+    if (_copiedKeys != source._keysChanged) {
+        _copiedKeys = neverChanged; // for when memory is short on the way
+        _entries.resize(source._entries.size());
+        for (std::size_t i = 0; i < _entries.size(); ++i) {
+            _entries[i].key = source._entries[i].key;
+            _entries[i].value.assignCopy(source._entries[i].value);
+        }
+        rebuildIndex();
+    } else if (_copiedEntries != source._entriesChanged || source._holdsNodes) {
+        for (std::size_t i = 0; i < _entries.size(); ++i)
+            _entries[i].value.assignCopy(source._entries[i].value);
+    }
+    _copiedKeys = source._keysChanged;
+    _copiedEntries = source._entriesChanged;
+    _holdsNodes = source._holdsNodes;
+    _due = source._due;
+    _later.resize(source._later.size());
+    for (std::size_t i = 0; i < _later.size(); ++i) {
+        const Later& later = source._later[i];
+        if (later.isDue())
+            _later[i].ask(later.writing, later.bytes, later.turn);
+        else
+            _later[i].turn = 0;
+    }
+    _frozen = true;
+}
+
+void Dictionary::rebuildIndex() {
+    _index.clear();
+    if (_entries.size() < indexedFrom)
+        return;
+    for (std::size_t i = 0; i < _entries.size(); ++i)
+        _index.emplace(_entries[i].key, i);
+}
+
+void Dictionary::expectMutable() const {
+    if (_frozen)
+        throw std::logic_error("a frozen dictionary cannot be changed");
+}
+
+} // namespace velmora
