@@ -8,6 +8,21 @@
 
 namespace velmora {
 
+namespace {
+
+/// One row for each of the entries, which stand side by side and are as long as their layout.
+void appendRows(Array& elements, Bytes entries, const Layout& layout) {
+    const CountedList list(Record(entries), 0, layout.minimumLength, entries.size() / layout.minimumLength);
+    elements.reserve(list.count());
+    for (std::size_t i = 0; i < list.count(); ++i) {
+        DictionaryRef row = makeDictionary();
+        writeFields(*row, list[i], layout);
+        elements.append(std::move(row));
+    }
+}
+
+} // namespace
+
 Base* Base::initWithDict(ClassDictionary& classDict, CodeDictionary& codeDict) {
     classDict.insert_or_assign(std::string(getSectionName()), this);
     updateLogCodeDict(codeDict);
@@ -68,29 +83,30 @@ void Base::setText(std::string_view label, std::string_view text) const {
         node->setText(label, text);
 }
 
-void Base::setList(std::string_view label, Array list) const {
-    if (const DictionaryRef node = dictionary())
-        node->set(label, std::make_shared<Array>(std::move(list)));
-}
-
 bool Base::show(const Record& record, const Layout& layout) const {
     if (record.size() < layout.minimumLength)
         return false;
     if (const DictionaryRef node = dictionary())
-        writeFields(*node, record, layout);
+        writeFieldsLater(*node, record, layout);
     return true;
+}
+
+void Base::showList(const ListField& field, const CountedList& list, std::uint32_t logCode) const {
+    constexpr auto write = [](Dictionary& node, Bytes bytes, const void* table) {
+        const auto& wanted = *static_cast<const ListField*>(table);
+        const ArrayRef entries = makeArray();
+        appendRows(*entries, bytes, wanted.entry);
+        node.set(wanted.label, entries);
+    };
+    reportMissingEntries(list, logCode);
+    if (const DictionaryRef node = dictionary())
+        node->writeLater({write, &field}, list.entries().bytes());
 }
 
 Array Base::rows(const CountedList& list, const Layout& layout, std::uint32_t logCode) {
     reportMissingEntries(list, logCode);
     Array result;
-    const std::size_t whole = list.whole();
-    result.reserve(whole);
-    for (std::size_t i = 0; i < whole; ++i) {
-        DictionaryRef row = makeDictionary();
-        writeFields(*row, list[i], layout);
-        result.append(std::move(row));
-    }
+    appendRows(result, list.entries().bytes(), layout);
     return result;
 }
 
@@ -112,6 +128,28 @@ void Base::clearElements() const {
 void Base::replaceElements(const Array& newElements) const {
     if (const ArrayRef node = array())
         replaceArray(*node, newElements);
+}
+
+void Base::showRows(const CountedList& list, const Layout& layout, std::uint32_t logCode) const {
+    constexpr auto write = [](Array& elements, Bytes bytes, const void* table) {
+        appendRows(elements, bytes, *static_cast<const Layout*>(table));
+    };
+    reportMissingEntries(list, logCode);
+    replaceElementsLater({write, &layout}, list.entries());
+}
+
+void Base::replaceElementsLater(const Writing<Array>& writing, const Record& record) const {
+    if (const ArrayRef node = array()) {
+        ArrayLock::Guard guard;
+        node->writeLater(writing, record.bytes());
+    }
+}
+
+const std::vector<Cell>* Base::cellsOf(const Data& record) const {
+    const std::vector<Cell>* cells = readCells(record);
+    if (!cells)
+        logLine(LogPriority::Error, "Failed to get Cell Array\n");
+    return cells;
 }
 
 void Base::unknownLogMessage(std::uint32_t logCode) {

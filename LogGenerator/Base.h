@@ -1,5 +1,6 @@
 #pragma once
 
+#include "LogGenerator/CellList.h"
 #include "LogGenerator/Field.h"
 #include "LogGenerator/Record.h"
 #include "Platform/Value.h"
@@ -24,9 +25,19 @@ using CodeDictionary = std::map<std::string, std::vector<Base*>, std::less<>>;
 /// The extra stream's codes start here: 0xFF0000 plus the 16-bit code of the record.
 inline constexpr std::uint32_t firstExtraCode = 0xFF0000;
 
+/// A list that stands as a value in a section's dictionary: its label, and the table of its entries.
+struct ListField {
+    std::string_view label;
+    Layout entry;
+};
+
 /// A section: one block of the measurement screen. It names itself, lists the log codes that it wants, and
 /// writes display strings straight into its node of the display dictionary when one of their records arrives.
 /// The node is owned by the display; the section only refers to it. Main thread only.
+///
+/// What a section shows by its tables is handed to the node as bytes and becomes text when the node is looked
+/// at (see Writing); errors in the record are found and told when it arrives. So the tables and functions
+/// that are given to show... must be constants.
 class Base {
 public:
     virtual ~Base() = default;
@@ -53,6 +64,9 @@ public:
     /// Appends this section to the subscribers of each of its codes: a code listed twice is subscribed twice.
     void updateLogCodeDict(CodeDictionary& codeDict);
 
+    /// Has the section read the cell information array together with others.
+    void shareCellList(std::shared_ptr<CellList> cells) { _cells = std::move(cells); }
+
     /// Both rewrite the array under `ArrayLock`; the array object stays the same, so that the display keeps
     /// pointing at it.
     static void clearElementsInArray(Array& array);
@@ -75,15 +89,23 @@ protected:
     void setText(std::string_view label, std::string_view text) const;
     void setText(std::string_view label, const NumberText& number) const { setText(label, number.text()); }
 
-    /// Puts a new array value into the dictionary node; one that the display held under the label stays
-    /// unchanged.
-    void setList(std::string_view label, Array list) const;
-
     /// Writes all fields of the layout into the dictionary node, unless the record is shorter than its
     /// minimum, which is ignored silently. Whether it was long enough.
     bool show(const Record& record, const Layout& layout) const;
+    /// Has `write(node, record)` write into the dictionary node once somebody looks at it (see Writing): what
+    /// a layout does not say. It sets the same labels whatever the record.
+    template <void (*write)(Dictionary& node, const Record& record)>
+    void showWith(const Record& record) const {
+        constexpr auto later = [](Dictionary& node, Bytes bytes, const void*) { write(node, Record(bytes)); };
+        if (const DictionaryRef node = dictionary())
+            node->writeLater({later, nullptr}, record.bytes());
+    }
+    /// Puts a new array of rows (see `rows`) into the dictionary node; one that the display held under the
+    /// label stays unchanged.
+    void showList(const ListField& field, const CountedList& list, std::uint32_t logCode) const;
 
-    /// A new array of one dictionary per entry, made by `layout`. Where the count promises more entries than
+    /// A new array of one dictionary per entry, made by `layout`, whose minimum length is the entries' and
+    /// their stride. Where the count promises more entries than
     /// the record holds, those that lie wholly inside are shown and one error line says so.
     [[nodiscard]] static Array rows(const CountedList& list, const Layout& layout, std::uint32_t logCode);
     /// That error line, where it is due.
@@ -94,14 +116,35 @@ protected:
     /// The array node emptied or refilled as above; nothing without a node.
     void clearElements() const;
     void replaceElements(const Array& newElements) const;
+    /// The array node refilled with such rows.
+    void showRows(const CountedList& list, const Layout& layout, std::uint32_t logCode) const;
+    /// The array node refilled by `fill(elements, record)` once somebody looks at it.
+    template <void (*fill)(Array& elements, const Record& record)>
+    void showElementsWith(const Record& record) const {
+        constexpr auto later = [](Array& elements, Bytes bytes, const void*) {
+            fill(elements, Record(bytes));
+        };
+        replaceElementsLater({later, nullptr}, record);
+    }
+
+    /// The cells of a 0xFF0001 record (see CellList). Where there are none to be had, null and the error line
+    /// "Failed to get Cell Array".
+    [[nodiscard]] const std::vector<Cell>* cellsOf(const Data& record) const;
+    /// The same without that line.
+    [[nodiscard]] const std::vector<Cell>* readCells(const Data& record) const {
+        return _cells->read(record);
+    }
 
     /// The error line for a code that the section does not handle.
     static void unknownLogMessage(std::uint32_t logCode);
 
 private:
+    void replaceElementsLater(const Writing<Array>& writing, const Record& record) const;
+
     /// `sectionRef`: the one of the two that fits the node's kind. Weak, since the display owns the node.
     std::weak_ptr<Dictionary> _dictionaryRef;
     std::weak_ptr<Array> _arrayRef;
+    std::shared_ptr<CellList> _cells = std::make_shared<CellList>();
 };
 
 } // namespace velmora

@@ -3,6 +3,7 @@
 #include "Platform/Console.h"
 #include "Platform/SystemLog.h"
 
+#include <bit>
 #include <charconv>
 #include <type_traits>
 
@@ -18,10 +19,28 @@ Base* ClassIndex::getClass(std::string_view name) const {
 }
 
 const std::vector<Base*>* ClassIndex::getSubscribers(std::uint32_t code) const {
-    char key[10];
-    const auto end = std::to_chars(key, key + sizeof key, code).ptr;
-    const auto found = codeDictionary.find(std::string_view(key, static_cast<std::size_t>(end - key)));
-    return found == codeDictionary.end() ? nullptr : &found->second;
+    if (_routes.empty() || _routedCodes != codeDictionary.size())
+        makeRoutes();
+    std::size_t place = code % _routes.size();
+    while (_routes[place].subscribers && _routes[place].code != code)
+        place = (place + 1) % _routes.size();
+    return _routes[place].subscribers;
+}
+
+void ClassIndex::makeRoutes() const {
+    // A power of two, at most a quarter full.
+    _routes.assign(std::bit_ceil(4 * codeDictionary.size() + 4), Route());
+    for (const auto& [text, subscribers] : codeDictionary) {
+        std::uint32_t code = 0;
+        std::from_chars(text.data(), text.data() + text.size(), code);
+        if (std::to_string(code) != text)
+            continue; // no code is written so
+        std::size_t place = code % _routes.size();
+        while (_routes[place].subscribers)
+            place = (place + 1) % _routes.size();
+        _routes[place] = {code, &subscribers};
+    }
+    _routedCodes = codeDictionary.size();
 }
 
 std::vector<std::string> ClassIndex::getAllLogCodes() const {

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "LogGenerator/Base.h"
+#include "LogGenerator/CellList.h"
 
 #include <memory>
 #include <string>
@@ -36,8 +37,24 @@ protected:
     template <class Section>
     void create(std::unique_ptr<Section>& field) {
         field = std::make_unique<Section>();
+        field->shareCellList(_cellList);
         field->initWithDict(classDict, codeDictionary);
+        _routes.clear();
     }
+
+private:
+    /// A code of `codeDictionary` and where its sections stand there; null in a place that is free.
+    struct Route {
+        std::uint32_t code = 0;
+        const std::vector<Base*>* subscribers = nullptr;
+    };
+    void makeRoutes() const;
+
+    std::shared_ptr<CellList> _cellList = std::make_shared<CellList>();
+    /// `codeDictionary` as it is looked at for every message: by the code itself, at its remainder or in the
+    /// next place that is free. Made when it is asked for and codes have been added.
+    mutable std::vector<Route> _routes;
+    mutable std::size_t _routedCodes = 0;
 };
 
 } // namespace velmora

@@ -4,6 +4,7 @@
 #include "Platform/SystemLog.h"
 #include "Platform/TelephonyService.h"
 
+#include <algorithm>
 #include <cmath>
 #include <limits>
 
@@ -12,6 +13,7 @@ namespace velmora {
 namespace {
 
 constexpr std::size_t headerLength = 13;
+constexpr std::size_t longestRemembered = std::size_t{1} << 16;
 
 Result<Value> readPayload(const Data& record) {
     return readPropertyList(record.from(headerLength).bytes());
@@ -24,8 +26,29 @@ bool holds(const Dictionary& cell, std::string_view key, std::string_view text) 
 
 } // namespace
 
-LogCode_0xFF0000::SIMFileReader::SIMFileReader(const Data& record) {
+Result<Value> RememberedPayloads::read(const Data& record) {
+    const Bytes bytes = record.from(headerLength).bytes();
+    for (const Payload& known : _payloads)
+        if (!known.value.isNone() &&
+            std::equal(bytes.begin(), bytes.end(), known.bytes.begin(), known.bytes.end()))
+            return known.value;
     Result<Value> payload = readPayload(record);
+    if (payload && bytes.size() <= longestRemembered) {
+        _payloads[_next] = {{bytes.begin(), bytes.end()}, *payload};
+        _next = (_next + 1) % _payloads.size();
+    }
+    return payload;
+}
+
+LogCode_0xFF0000::SIMFileReader::SIMFileReader(const Data& record) {
+    take(readPayload(record));
+}
+
+LogCode_0xFF0000::SIMFileReader::SIMFileReader(const Data& record, RememberedPayloads& earlier) {
+    take(earlier.read(record));
+}
+
+void LogCode_0xFF0000::SIMFileReader::take(Result<Value> payload) {
     if (!payload) {
         logLine(LogPriority::Error, "SIM File dictionary data could not be constructed");
         throw UnknownDataException();
@@ -39,7 +62,15 @@ const Value* LogCode_0xFF0000::SIMFileReader::value(std::string_view key) const 
 }
 
 ContextListReader::ContextListReader(const Data& record) {
-    if (Result<Value> payload = readPayload(record); payload && payload->asArray())
+    take(readPayload(record));
+}
+
+ContextListReader::ContextListReader(const Data& record, RememberedPayloads& earlier) {
+    take(earlier.read(record));
+}
+
+void ContextListReader::take(Result<Value> payload) {
+    if (payload && payload->asArray())
         _contexts = *std::move(payload);
 }
 
@@ -80,13 +111,6 @@ std::optional<std::int32_t> cellNumber(const Dictionary& cell, std::string_view 
         return static_cast<std::int32_t>(*real);
     }
     return std::nullopt;
-}
-
-const Dictionary* firstCell(const Array& cells, std::string_view technology, std::string_view type) {
-    for (const Value& cell : cells)
-        if (isCell(cell, technology, type))
-            return cell.asDictionary();
-    return nullptr;
 }
 
 } // namespace velmora

@@ -1,16 +1,36 @@
 #pragma once
 
+#include "Platform/Result.h"
 #include "Platform/Value.h"
 
+#include <array>
+#include <cstddef>
 #include <cstdint>
 #include <exception>
 #include <optional>
 #include <string_view>
+#include <vector>
 
 namespace velmora {
 
 /// The extra stream's payload readers. Each is built from a whole record, reads the property list behind the
 /// 13-byte header and holds what it found for as long as it lives.
+
+/// The payloads that a section read last and what they held. The SIM's files and the contexts are told again
+/// and again without having changed, in both forms by turns: two of them are kept.
+class RememberedPayloads {
+public:
+    /// What the record's payload holds, as readPropertyList gives it.
+    [[nodiscard]] Result<Value> read(const Data& record);
+
+private:
+    struct Payload {
+        std::vector<std::uint8_t> bytes;
+        Value value;
+    };
+    std::array<Payload, 2> _payloads;
+    std::size_t _next = 0; ///< which is forgotten next
+};
 
 namespace LogCode_0xFF0000 {
 
@@ -27,10 +47,13 @@ class SIMFileReader {
 public:
     /// Logs and raises UnknownDataException when the payload cannot be read.
     explicit SIMFileReader(const Data& record);
+    SIMFileReader(const Data& record, RememberedPayloads& earlier);
     /// The value under `key`; null when there is none.
     [[nodiscard]] const Value* value(std::string_view key) const;
 
 private:
+    void take(Result<Value> payload);
+
     Value _files;
 };
 
@@ -40,9 +63,12 @@ private:
 class ContextListReader {
 public:
     explicit ContextListReader(const Data& record);
+    ContextListReader(const Data& record, RememberedPayloads& earlier);
     [[nodiscard]] const Array* contexts() const { return _contexts.asArray(); }
 
 private:
+    void take(Result<Value> payload);
+
     Value _contexts;
 };
 
@@ -70,9 +96,5 @@ private:
 /// text, data and booleans are no numbers, and a number that 32 bits or a whole number cannot hold would show
 /// as another one.
 [[nodiscard]] std::optional<std::int32_t> cellNumber(const Dictionary& cell, std::string_view key);
-
-/// The first cell of the technology and type, or null.
-[[nodiscard]] const Dictionary* firstCell(const Array& cells, std::string_view technology,
-                                          std::string_view type);
 
 } // namespace velmora

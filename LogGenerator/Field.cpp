@@ -42,4 +42,11 @@ void writeFields(Dictionary& node, const Record& record, const Layout& layout) {
         writeValue(node, field.label, field.show, field.where.read(record));
 }
 
+void writeFieldsLater(Dictionary& node, const Record& record, const Layout& layout) {
+    constexpr auto write = [](Dictionary& target, Bytes bytes, const void* table) {
+        writeFields(target, Record(bytes), *static_cast<const Layout*>(table));
+    };
+    node.writeLater({write, &layout}, record.bytes().first(layout.minimumLength));
+}
+
 } // namespace velmora

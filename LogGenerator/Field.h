@@ -169,4 +169,7 @@ void writeValue(Dictionary& node, std::string_view label, const Show& show, std:
 /// Writes every field, in table order, under its label. Precondition: the record has the minimum length.
 void writeFields(Dictionary& node, const Record& record, const Layout& layout);
 
+/// The same, once somebody looks at the node (see Writing). The layout must be a constant.
+void writeFieldsLater(Dictionary& node, const Record& record, const Layout& layout);
+
 } // namespace velmora

@@ -59,8 +59,9 @@ void LogGenerator::updateHistoryInState(Dictionary& state, const Clock& clock) {
             return; // the entry ends before the first missing value
         entry->set(key, value.copy());
     }
-    entry->set("Date", dateDescription(clock.now()));
-    entry->set("Description", "Snapshot (" + dateDescription(clock.now()) + ")");
+    const std::string date = dateDescription(clock.now());
+    entry->set("Date", date);
+    entry->set("Description", "Snapshot (" + date + ")");
 }
 
 } // namespace velmora

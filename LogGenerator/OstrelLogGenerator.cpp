@@ -62,8 +62,10 @@ ArrayRef OstrelLogGenerator::getSaveContentsFromState(const Dictionary& state) c
 }
 
 void OstrelLogGenerator::handOverBinData(Dictionary& state) {
+    const std::size_t usual = _binData.size();
     state.set("DisplayState", Data(std::move(_binData)));
     _binData = {};
+    _binData.reserve(usual);
 }
 
 } // namespace velmora

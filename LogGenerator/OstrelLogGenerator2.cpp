@@ -59,7 +59,8 @@ OstrelLogGenerator2::~OstrelLogGenerator2() {
 
 void OstrelLogGenerator2::updateState(Dictionary& state, const Data& data) {
     // Builds the display on the first message; what it returns is of no use here.
-    static_cast<void>(getDisplayFromState(state));
+    if (!_sectionsHaveNodes || !state.contains("Display"))
+        static_cast<void>(getDisplayFromState(state));
     updateWithData(data);
     keep(data);
 }

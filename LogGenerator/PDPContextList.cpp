@@ -7,7 +7,7 @@ namespace velmora {
 
 void PDPContextList::updateWithData(const Data& data, std::uint32_t) {
     logLine(LogPriority::Warning, "PDPContextList");
-    const ContextListReader reader(data);
+    const ContextListReader reader(data, _payloads);
     if (const Array* contexts = reader.contexts())
         replaceElements(*contexts);
 }

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "LogGenerator/Base.h"
+#include "LogGenerator/ExtraPayload.h"
 
 namespace velmora {
 
@@ -11,6 +12,9 @@ public:
     [[nodiscard]] std::string_view getSectionName() const override { return "PDP Context Info"; }
     [[nodiscard]] std::vector<std::uint32_t> getLogCodeArray() const override { return {0xFF0002}; }
     void updateWithData(const Data& data, std::uint32_t logCode) override;
+
+private:
+    RememberedPayloads _payloads;
 };
 
 } // namespace velmora

@@ -25,6 +25,7 @@ public:
     explicit Record(const Data& data) : _bytes(data.bytes()) {}
 
     [[nodiscard]] std::size_t size() const { return _bytes.size(); }
+    [[nodiscard]] Bytes bytes() const { return _bytes; }
     [[nodiscard]] bool has(std::size_t offset, std::size_t length) const {
         return offset <= size() && length <= size() - offset;
     }
@@ -40,12 +41,18 @@ public:
     }
     [[nodiscard]] std::int8_t i8(std::size_t offset) const { return static_cast<std::int8_t>(u8(offset)); }
     [[nodiscard]] std::uint16_t u16(std::size_t offset) const {
-        return static_cast<std::uint16_t>(littleEndian(offset, 2));
+        expect(offset, 2);
+        return static_cast<std::uint16_t>(_bytes[offset] | _bytes[offset + 1] << 8);
     }
     [[nodiscard]] std::int16_t i16(std::size_t offset) const {
         return static_cast<std::int16_t>(u16(offset));
     }
-    [[nodiscard]] std::uint32_t u32(std::size_t offset) const { return littleEndian(offset, 4); }
+    [[nodiscard]] std::uint32_t u32(std::size_t offset) const {
+        // Byte by byte, of which compilers make one load.
+        expect(offset, 4);
+        return std::uint32_t{_bytes[offset]} | std::uint32_t{_bytes[offset + 1]} << 8 |
+               std::uint32_t{_bytes[offset + 2]} << 16 | std::uint32_t{_bytes[offset + 3]} << 24;
+    }
     [[nodiscard]] std::int32_t i32(std::size_t offset) const {
         return static_cast<std::int32_t>(u32(offset));
     }
@@ -106,6 +113,14 @@ public:
         if (index >= whole())
             throw ArrayOutOfBoundsException();
         return _record.part(_first + _stride * index, _entryLength);
+    }
+
+    /// How far apart the entries begin.
+    [[nodiscard]] std::size_t stride() const { return _stride; }
+    /// What the record holds from the first entry to the end of the last whole one.
+    [[nodiscard]] Record entries() const {
+        const std::size_t count = whole();
+        return count == 0 ? Record(Bytes()) : _record.part(_first, _stride * (count - 1) + _entryLength);
     }
 
 private:

@@ -29,19 +29,27 @@ constexpr SIMFile simFiles[] = {
     {"kSimFile_OPLMNAcT", "EF-OPLMNAcT"},
 };
 
+/// The value as it stands: the service supplies what is to be shown.
+void put(Dictionary& node, std::string_view label, const Value& value) {
+    if (const std::string* text = value.asString())
+        node.setText(label, *text);
+    else
+        node.set(label, value);
+}
+
 } // namespace
 
 void SimInfo::updateWithData(const Data& data, std::uint32_t logCode) {
     logLine(LogPriority::Warning, "SimInfo");
     if (logCode != 0xFF0000)
         return;
-    const LogCode_0xFF0000::SIMFileReader reader(data);
+    const LogCode_0xFF0000::SIMFileReader reader(data, _payloads);
     const DictionaryRef node = dictionary();
     if (!node)
         return;
     for (const SIMFile& file : simFiles)
         if (const Value* value = reader.value(file.key))
-            node->set(file.label, *value); // as it stands: the service supplies what is to be shown
+            put(*node, file.label, *value);
 }
 
 } // namespace velmora

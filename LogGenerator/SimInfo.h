@@ -1,6 +1,7 @@
 #pragma once
 
 #include "LogGenerator/Base.h"
+#include "LogGenerator/ExtraPayload.h"
 
 namespace velmora {
 
@@ -11,6 +12,9 @@ public:
     [[nodiscard]] std::vector<std::uint32_t> getLogCodeArray() const override { return {0xFF0000}; }
     /// An unreadable payload raises LogCode_0xFF0000::UnknownDataException, which ends the program.
     void updateWithData(const Data& data, std::uint32_t logCode) override;
+
+private:
+    RememberedPayloads _payloads;
 };
 
 } // namespace velmora

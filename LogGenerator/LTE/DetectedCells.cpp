@@ -28,7 +28,7 @@ void DetectedCells::updateWithData(const Data& data, std::uint32_t logCode) {
     clearElements();
     const IntraFrequencyRecord measurement(record);
     if (measurement.detected().count() > 0)
-        replaceElements(rows(measurement.detected(), cell, logCode));
+        showRows(measurement.detected(), cell, logCode);
 }
 
 } // namespace velmora

@@ -1,7 +1,6 @@
 #include "LogGenerator/LTE/LTEServingCellInfo.h"
 
 #include "LogGenerator/CellFields.h"
-#include "LogGenerator/ExtraPayload.h"
 #include "Platform/SystemLog.h"
 #include "Platform/TelephonyService.h"
 
@@ -74,12 +73,11 @@ void LTEServingCellInfo::showCell(const Record& record) {
 }
 
 void LTEServingCellInfo::showServingCell(const Data& data) {
-    const CellInfoArrayReader reader(data);
-    const Array* cells = reader.cells();
+    const std::vector<Cell>* cells = cellsOf(data);
     if (!cells)
         return;
-    if (const Dictionary* serving =
-            firstCell(*cells, kVoxCellMonitorRadioAccessTechnologyLTE, kVoxCellMonitorCellTypeServing))
+    if (const Cell* serving =
+            firstCell(*cells, {kVoxCellMonitorRadioAccessTechnologyLTE, kVoxCellMonitorCellTypeServing}))
         writeCellFields(dictionary().get(), *serving, servingCellFields);
 }
 

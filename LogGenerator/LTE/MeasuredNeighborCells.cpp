@@ -30,7 +30,7 @@ void MeasuredNeighborCells::updateWithData(const Data& data, std::uint32_t logCo
     clearElements();
     const IntraFrequencyRecord measurement(record);
     if (measurement.neighbours().count() > 0)
-        replaceElements(rows(measurement.neighbours(), cell, logCode));
+        showRows(measurement.neighbours(), cell, logCode);
 }
 
 } // namespace velmora

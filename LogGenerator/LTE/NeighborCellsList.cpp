@@ -56,9 +56,10 @@ void NeighborCellsList::updateWithData(const Data& data, std::uint32_t logCode) 
     const CountedList& cells = measurement.cells();
     logFormat(LogPriority::Warning, "Number of neighboring cells being reported: %d\n",
               static_cast<int>(cells.count()));
-    for (std::size_t i = 0; i < cells.whole(); ++i)
-        trace(cells[i]);
-    replaceElements(rows(cells, cell, logCode));
+    if (systemLogWants(LogPriority::Warning))
+        for (std::size_t i = 0; i < cells.whole(); ++i)
+            trace(cells[i]);
+    showRows(cells, cell, logCode);
 }
 
 } // namespace velmora

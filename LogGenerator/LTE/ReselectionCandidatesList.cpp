@@ -55,6 +55,26 @@ const Layout& detailsOf(const Record& candidate) {
     return type < std::size(details) ? details[type] : noDetails;
 }
 
+/// How many candidates, from the first on, lie wholly inside the record with what belongs to their type.
+std::size_t wholeCandidates(const ReselectionRecord& reselection, const CountedList& headers) {
+    std::size_t i = 0;
+    while (i < headers.whole() && i < reselection.candidates(detailsOf(headers[i]).minimumLength).whole())
+        ++i;
+    return i;
+}
+
+void fill(Array& rows, const Record& record) {
+    const ReselectionRecord reselection(record);
+    const CountedList headers = reselection.candidates(header.minimumLength);
+    for (std::size_t i = 0, count = wholeCandidates(reselection, headers); i < count; ++i) {
+        const Layout& detail = detailsOf(headers[i]);
+        const DictionaryRef row = makeDictionary();
+        writeFields(*row, headers[i], header);
+        writeFields(*row, reselection.candidates(detail.minimumLength)[i], detail);
+        rows.append(row);
+    }
+}
+
 } // namespace
 
 void ReselectionCandidatesList::updateWithData(const Data& data, std::uint32_t logCode) {
@@ -71,19 +91,8 @@ void ReselectionCandidatesList::updateWithData(const Data& data, std::uint32_t l
     const CountedList headers = reselection.candidates(header.minimumLength);
     if (headers.count() == 0)
         return;
-    Array rows;
-    for (std::size_t i = 0; i < headers.whole(); ++i) {
-        const Layout& detail = detailsOf(headers[i]);
-        const CountedList candidates = reselection.candidates(detail.minimumLength);
-        if (i >= candidates.whole())
-            break;
-        const DictionaryRef row = makeDictionary();
-        writeFields(*row, candidates[i], header);
-        writeFields(*row, candidates[i], detail);
-        rows.append(row);
-    }
-    reportMissingEntries(rows.size(), headers.count(), logCode);
-    replaceElements(rows);
+    reportMissingEntries(wholeCandidates(reselection, headers), headers.count(), logCode);
+    showElementsWith<fill>(record);
 }
 
 } // namespace velmora

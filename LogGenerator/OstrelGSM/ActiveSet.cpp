@@ -22,6 +22,13 @@ DictionaryRef row(const Record& cell, const Record& measurement, int power) {
     return result;
 }
 
+void fill(Array& rows, const Record& record) {
+    const SearcherRecord searcher(record);
+    for (std::size_t i = 0; i < searcher.measurements().whole(); ++i)
+        if (const Record cell = searcher.cells()[i]; SearcherRecord::setType.read(cell) == activeSet)
+            rows.append(row(cell, searcher.measurements()[i], searcher.power()));
+}
+
 } // namespace
 
 void ActiveSet::updateWithData(const Data& data, std::uint32_t logCode) {
@@ -39,11 +46,7 @@ void ActiveSet::updateWithData(const Data& data, std::uint32_t logCode) {
         return;
     // The measurements lie behind the cells: one that lies wholly inside the record has its cell there too.
     reportMissingEntries(searcher.measurements(), logCode);
-    Array rows;
-    for (std::size_t i = 0; i < searcher.measurements().whole(); ++i)
-        if (const Record cell = searcher.cells()[i]; SearcherRecord::setType.read(cell) == activeSet)
-            rows.append(row(cell, searcher.measurements()[i], searcher.power()));
-    replaceElements(rows);
+    showElementsWith<fill>(record);
 }
 
 } // namespace velmora

@@ -16,7 +16,7 @@ constexpr Field channelFields[] = {
     {"CRC Received", i32At(1), integer("%d")},
     {"CRC Received in Error", i32At(5), integer("%d")},
 };
-constexpr Layout channel = layout(9, channelFields);
+constexpr ListField channelList = {"Transport Channels", layout(9, channelFields)};
 
 } // namespace
 
@@ -29,8 +29,8 @@ void BLER::updateWithData(const Data& data, std::uint32_t logCode) {
     const Record record(data);
     if (!show(record, window))
         return;
-    const CountedList channels(record, window.minimumLength, channel.minimumLength, record.u8(13));
-    setList("Transport Channels", rows(channels, channel, logCode));
+    const CountedList channels(record, window.minimumLength, channelList.entry.minimumLength, record.u8(13));
+    showList(channelList, channels, logCode);
 }
 
 } // namespace velmora

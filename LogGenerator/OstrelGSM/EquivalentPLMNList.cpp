@@ -16,6 +16,21 @@ std::int64_t threeDigits(unsigned hundreds, unsigned tens, unsigned ones) {
     return hundreds * 100 + tens * 10 + ones;
 }
 
+CountedList networks(const Record& record) {
+    return CountedList(record, minimumLength, stride, entryLength, record.u8(16));
+}
+
+void fill(Array& rows, const Record& record) {
+    const CountedList entries = networks(record);
+    for (std::size_t i = 0; i < entries.whole(); ++i) {
+        const Record e = entries[i];
+        const DictionaryRef row = makeDictionary();
+        row->setText("Mobile Country Code", NumberText("%d", threeDigits(e.u8(0), e.u8(2), e.u8(4))).text());
+        row->setText("Mobile Network Code", NumberText("%d", threeDigits(e.u8(1), e.u8(3), e.u8(5))).text());
+        rows.append(row);
+    }
+}
+
 } // namespace
 
 void EquivalentPLMNList::updateWithData(const Data& data, std::uint32_t logCode) {
@@ -28,20 +43,12 @@ void EquivalentPLMNList::updateWithData(const Data& data, std::uint32_t logCode)
     if (record.size() < minimumLength)
         return;
     clearElements();
-    const CountedList entries(record, minimumLength, stride, entryLength, record.u8(16));
+    const CountedList entries = networks(record);
     if (entries.count() == 0)
         return;
     // The list ends with the last entry that lies wholly inside the record.
     reportMissingEntries(entries, logCode);
-    Array rows;
-    for (std::size_t i = 0; i < entries.whole(); ++i) {
-        const Record e = entries[i];
-        const DictionaryRef row = makeDictionary();
-        row->setText("Mobile Country Code", NumberText("%d", threeDigits(e.u8(0), e.u8(2), e.u8(4))).text());
-        row->setText("Mobile Network Code", NumberText("%d", threeDigits(e.u8(1), e.u8(3), e.u8(5))).text());
-        rows.append(row);
-    }
-    replaceElements(rows);
+    showElementsWith<fill>(record);
 }
 
 } // namespace velmora

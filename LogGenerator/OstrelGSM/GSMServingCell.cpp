@@ -1,7 +1,6 @@
 #include "LogGenerator/OstrelGSM/GSMServingCell.h"
 
 #include "LogGenerator/CellFields.h"
-#include "LogGenerator/ExtraPayload.h"
 #include "Platform/SystemLog.h"
 #include "Platform/TelephonyService.h"
 
@@ -53,12 +52,11 @@ void GSMServingCell::updateWithData(const Data& data, std::uint32_t logCode) {
 }
 
 void GSMServingCell::showServingCell(const Data& data) {
-    const CellInfoArrayReader reader(data);
-    const Array* cells = reader.cells();
+    const std::vector<Cell>* cells = cellsOf(data);
     if (!cells)
         return;
-    if (const Dictionary* cell =
-            firstCell(*cells, kVoxCellMonitorRadioAccessTechnologyGSM, kVoxCellMonitorCellTypeServing))
+    if (const Cell* cell =
+            firstCell(*cells, {kVoxCellMonitorRadioAccessTechnologyGSM, kVoxCellMonitorCellTypeServing}))
         writeCellFields(dictionary().get(), *cell, cellFields);
 }
 

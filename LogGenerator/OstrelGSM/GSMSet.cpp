@@ -35,7 +35,7 @@ void GSMSet::updateWithData(const Data& data, std::uint32_t logCode) {
                               static_cast<std::size_t>(count.read(record)));
     if (entries.count() == 0)
         return;
-    replaceElements(rows(entries, cell, logCode));
+    showRows(entries, cell, logCode);
 }
 
 } // namespace velmora

@@ -30,6 +30,8 @@ constexpr Field processFields[] = {
     {"Block Errors", u16At(7), integer("%u")},
 };
 constexpr Layout process = layout(9, processFields);
+constexpr ListField primaryProcesses = {"Primary HARQ Process", process};
+constexpr ListField secondaryProcesses = {"Secondary HARQ Process", process};
 // How far every primary process moves the secondary ones: not the nine bytes of its entry. That is how the
 // record is read, and it is kept.
 constexpr std::size_t primarySpan = 162;
@@ -48,12 +50,12 @@ void HSDPAInformation::updateWithData(const Data& data, std::uint32_t logCode) {
     // Where a kind has no process, what was shown of it stays.
     if (primaryCount != 0) {
         const CountedList primary(record, status.minimumLength, process.minimumLength, primaryCount);
-        setList("Primary HARQ Process", rows(primary, process, logCode));
+        showList(primaryProcesses, primary, logCode);
     }
     if (secondaryCount != 0) {
         const CountedList secondary(record, status.minimumLength + primarySpan * primaryCount,
                                     process.minimumLength, secondaryCount);
-        setList("Secondary HARQ Process", rows(secondary, process, logCode));
+        showList(secondaryProcesses, secondary, logCode);
     }
 }
 

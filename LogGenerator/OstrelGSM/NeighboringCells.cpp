@@ -1,7 +1,6 @@
 #include "LogGenerator/OstrelGSM/NeighboringCells.h"
 
 #include "LogGenerator/CellFields.h"
-#include "LogGenerator/ExtraPayload.h"
 #include "Platform/SystemLog.h"
 #include "Platform/TelephonyService.h"
 
@@ -16,6 +15,7 @@ constexpr Field measuredFields[] = {
     {"C1 Value", i32At(3), integer("%d")},
 };
 constexpr Layout measured = layout(14, measuredFields);
+constexpr Where measuredARFCN = measuredFields[0].where;
 
 constexpr std::size_t bsicMinimumLength = 15; // 0x51FF
 constexpr std::size_t bsicEntryLength = 4;
@@ -30,6 +30,27 @@ constexpr CellField knownFields[] = {
     {kVoxCellMonitorRSSI, CellNumber::SignedLow16, "RSSI",
      unless(levelNotMeasured, "", integer("%d dBm", 0, 2)), "NeighboringCells: Failed to retrieve RSSI\n"},
 };
+
+constexpr CellRows known = {{kVoxCellMonitorRadioAccessTechnologyGSM, kVoxCellMonitorCellTypeNeighbor},
+                            knownFields};
+
+/// `bytes`: the number of cells, the entries of 0x5137, then those of 0x51FF.
+void fill(Array& rows, const Record& bytes) {
+    const CountedList cells(bytes, 1, measured.minimumLength, bytes.u8(0));
+    const std::size_t behind = 1 + cells.count() * measured.minimumLength;
+    const CountedList bsics(bytes, behind, bsicEntryLength, (bytes.size() - behind) / bsicEntryLength);
+    for (std::size_t i = 0; i < cells.count(); ++i) {
+        const DictionaryRef row = makeDictionary();
+        writeFields(*row, cells[i], measured);
+        // Of an ARFCN that stands there twice, the later one counts.
+        for (std::size_t j = bsics.count(); j-- > 0;)
+            if (bsicARFCN.read(bsics[j]) == measuredARFCN.read(cells[i])) {
+                writeValue(*row, "BSIC", integer("%d"), bsic.read(bsics[j]));
+                break;
+            }
+        rows.append(row);
+    }
+}
 
 } // namespace
 
@@ -51,41 +72,30 @@ void NeighboringCells::showMeasuredCells(const Record& record) {
     const CountedList entries(record, measuredMinimumLength, measured.minimumLength, record.u8(28));
     if (entries.count() == 0)
         return;
-    const Array cells = rows(entries, measured, 0x5137);
-    for (const Value& cell : cells) {
-        Dictionary& row = *cell.asDictionary();
-        if (const Value* known = arfcnToBsic.find(*row["ARFCN"].asString()))
-            row.set("BSIC", *known);
-    }
-    replaceElements(cells);
+    reportMissingEntries(entries, 0x5137);
+    // The BSICs as they are known now go with the cells.
+    const Bytes cells = entries.entries().bytes();
+    _measuredCells.assign(1, static_cast<std::uint8_t>(entries.whole()));
+    _measuredCells.insert(_measuredCells.end(), cells.begin(), cells.end());
+    _measuredCells.insert(_measuredCells.end(), arfcnToBsic.begin(), arfcnToBsic.end());
+    showElementsWith<fill>(Record(Bytes(_measuredCells)));
 }
 
 void NeighboringCells::keepBSICs(const Record& record) {
     if (record.size() < bsicMinimumLength)
         return;
-    arfcnToBsic = Dictionary();
     const CountedList entries(record, bsicMinimumLength, bsicEntryLength, record.u8(14));
     reportMissingEntries(entries, 0x51FF);
-    for (std::size_t i = 0; i < entries.whole(); ++i)
-        writeValue(arfcnToBsic, NumberText("%d", bsicARFCN.read(entries[i])).text(), integer("%d"),
-                   bsic.read(entries[i]));
+    const Bytes kept = entries.entries().bytes();
+    arfcnToBsic.assign(kept.begin(), kept.end());
 }
 
 void NeighboringCells::showKnownCells(const Data& data) {
-    const CellInfoArrayReader reader(data);
-    clearElements(); // before the cells are looked at: where there are none to be had, the list stays empty
-    const Array* cells = reader.cells();
+    clearElements(); // first, so that the list is empty where the cells cannot be had
+    const std::vector<Cell>* cells = cellsOf(data);
     if (!cells)
         return;
-    Array known;
-    for (const Value& cell : *cells) {
-        if (!isCell(cell, kVoxCellMonitorRadioAccessTechnologyGSM, kVoxCellMonitorCellTypeNeighbor))
-            continue;
-        const DictionaryRef row = makeDictionary();
-        writeCellFields(row.get(), *cell.asDictionary(), knownFields);
-        known.append(row); // even one without a field
-    }
-    replaceElements(known);
+    writeCellRows(array().get(), *cells, known, _knownCells);
 }
 
 } // namespace velmora

@@ -22,8 +22,10 @@ private:
     /// 0xFF0001: the neighbours that the telephony service knows.
     void showKnownCells(const Data& data);
 
-    /// The decimal text of an ARFCN to that of its BSIC, made anew by every 0x51FF.
-    Dictionary arfcnToBsic;
+    /// ARFCNs with their BSICs: the entries of the latest 0x51FF as they stand there.
+    std::vector<std::uint8_t> arfcnToBsic;
+    std::vector<std::uint8_t> _measuredCells; ///< used again for each 0x5137
+    std::vector<std::uint8_t> _knownCells;    ///< used again for each 0xFF0001
 };
 
 } // namespace velmora

@@ -1,7 +1,6 @@
 #include "LogGenerator/OstrelGSM/ServingPLMN.h"
 
 #include "LogGenerator/CellFields.h"
-#include "LogGenerator/ExtraPayload.h"
 #include "Platform/SystemLog.h"
 #include "Platform/TelephonyService.h"
 
@@ -37,6 +36,18 @@ char digit(unsigned halfByte) {
     return static_cast<char>(halfByte < 10 ? '0' + halfByte : ' ');
 }
 
+void writeIdentity(Dictionary& node, const Record& record) {
+    // BCD as in 3GPP TS 24.008, 10.5.1.3: two digits a byte, the lower half first, MNC digit 3 in the middle
+    // byte. A two-digit MNC so ends in a blank.
+    const char mcc[] = {digit(record.bits(15, 0, 4)), digit(record.bits(15, 4, 4)),
+                        digit(record.bits(16, 0, 4))};
+    const char mnc[] = {digit(record.bits(17, 0, 4)), digit(record.bits(17, 4, 4)),
+                        digit(record.bits(16, 4, 4))};
+    node.setText("Mobile Country Code", std::string_view(mcc, sizeof mcc));
+    node.setText("Mobile Network Code", std::string_view(mnc, sizeof mnc));
+    writeFields(node, record, areas);
+}
+
 // Plain decimal numbers, so that a leading zero of the MNC is lost, under the labels that 0x7135 writes as
 // three characters: whichever came last is shown.
 constexpr CellField cellFields[] = {
@@ -48,9 +59,9 @@ constexpr CellField cellFields[] = {
      "ServingPLMN: Failed to retrieve LAC\n"},
 };
 
-bool isServingCell(const Value& cell) {
-    return isCell(cell, kVoxCellMonitorRadioAccessTechnologyGSM, kVoxCellMonitorCellTypeServing) ||
-           isCell(cell, kVoxCellMonitorRadioAccessTechnologyUMTS, kVoxCellMonitorCellTypeServing);
+bool isServingCell(const Cell& cell) {
+    return cell.kind == CellKind(kVoxCellMonitorRadioAccessTechnologyGSM, kVoxCellMonitorCellTypeServing) ||
+           cell.kind == CellKind(kVoxCellMonitorRadioAccessTechnologyUMTS, kVoxCellMonitorCellTypeServing);
 }
 
 } // namespace
@@ -69,26 +80,17 @@ void ServingPLMN::updateWithData(const Data& data, std::uint32_t logCode) {
 void ServingPLMN::showIdentity(const Record& record) {
     if (record.size() < areas.minimumLength)
         return;
-    // BCD as in 3GPP TS 24.008, 10.5.1.3: two digits a byte, the lower half first, MNC digit 3 in the middle
-    // byte. A two-digit MNC so ends in a blank.
-    const char mcc[] = {digit(record.bits(15, 0, 4)), digit(record.bits(15, 4, 4)),
-                        digit(record.bits(16, 0, 4))};
-    const char mnc[] = {digit(record.bits(17, 0, 4)), digit(record.bits(17, 4, 4)),
-                        digit(record.bits(16, 4, 4))};
-    setText("Mobile Country Code", std::string_view(mcc, sizeof mcc));
-    setText("Mobile Network Code", std::string_view(mnc, sizeof mnc));
-    show(record, areas);
+    showWith<writeIdentity>(record);
 }
 
 void ServingPLMN::showServingCell(const Data& data) {
-    const CellInfoArrayReader reader(data);
-    const Array* cells = reader.cells();
+    const std::vector<Cell>* cells = cellsOf(data);
     if (!cells)
         return;
-    for (const Value& cell : *cells) {
+    for (const Cell& cell : *cells) {
         if (!isServingCell(cell))
             continue;
-        writeCellFields(dictionary().get(), *cell.asDictionary(), cellFields);
+        writeCellFields(dictionary().get(), cell, cellFields);
         return; // only the first serving cell counts
     }
 }

@@ -1,7 +1,6 @@
 #include "LogGenerator/OstrelGSM/UMTSRRInfo.h"
 
 #include "LogGenerator/CellFields.h"
-#include "LogGenerator/ExtraPayload.h"
 #include "Platform/SystemLog.h"
 #include "Platform/TelephonyService.h"
 
@@ -49,6 +48,29 @@ constexpr CellField servingCellFields[] = {
      "UMTSRRInfo: Failed to retrieve Scrambling Code\n"},
 };
 
+CountedList powerEntries(const Record& record) {
+    return CountedList(record, powerMinimumLength, powerEntryLength, record.u8(14));
+}
+
+void writeTransmitPower(Dictionary& node, const Record& record) {
+    const CountedList entries = powerEntries(record);
+    int sum = 0;
+    int count = 0;
+    for (std::size_t i = 0; i < entries.whole(); ++i) {
+        const int term = static_cast<int>(powerTerm.read(entries[i]));
+        if (term == 0)
+            continue; // neither summed nor counted
+        // The term is in tenths of a dB, and rounded toward zero.
+        sum += (term + 512) / 10 - 70;
+        ++count;
+    }
+    // The mean of no term is not a number and shows as that, on purpose. Dividing zero by zero would give it
+    // a sign that depends on the processor.
+    const double mean =
+        count != 0 ? static_cast<double>(sum) / count : std::numeric_limits<double>::quiet_NaN();
+    node.setText("Transmit Power", NumberText("%4.2lf dBm", mean).text());
+}
+
 } // namespace
 
 void UMTSRRInfo::updateWithData(const Data& data, std::uint32_t logCode) {
@@ -67,23 +89,8 @@ void UMTSRRInfo::updateWithData(const Data& data, std::uint32_t logCode) {
 void UMTSRRInfo::showTransmitPower(const Record& record) {
     if (record.size() < powerMinimumLength)
         return;
-    const CountedList entries(record, powerMinimumLength, powerEntryLength, record.u8(14));
-    reportMissingEntries(entries, 0x4031);
-    int sum = 0;
-    int count = 0;
-    for (std::size_t i = 0; i < entries.whole(); ++i) {
-        const int term = static_cast<int>(powerTerm.read(entries[i]));
-        if (term == 0)
-            continue; // neither summed nor counted
-        // The term is in tenths of a dB, and rounded toward zero.
-        sum += (term + 512) / 10 - 70;
-        ++count;
-    }
-    // The mean of no term is not a number and shows as that, on purpose. Dividing zero by zero would give it
-    // a sign that depends on the processor.
-    const double mean =
-        count != 0 ? static_cast<double>(sum) / count : std::numeric_limits<double>::quiet_NaN();
-    setText("Transmit Power", NumberText("%4.2lf dBm", mean));
+    reportMissingEntries(powerEntries(record), 0x4031);
+    showWith<writeTransmitPower>(record);
 }
 
 void UMTSRRInfo::showCell(const Record& record) {
@@ -95,12 +102,11 @@ void UMTSRRInfo::showCell(const Record& record) {
 }
 
 void UMTSRRInfo::showServingCell(const Data& data) {
-    const CellInfoArrayReader reader(data);
-    const Array* cells = reader.cells();
+    const std::vector<Cell>* cells = cellsOf(data);
     if (!cells)
         return;
-    if (const Dictionary* serving =
-            firstCell(*cells, kVoxCellMonitorRadioAccessTechnologyUMTS, kVoxCellMonitorCellTypeServing))
+    if (const Cell* serving =
+            firstCell(*cells, {kVoxCellMonitorRadioAccessTechnologyUMTS, kVoxCellMonitorCellTypeServing}))
         writeCellFields(dictionary().get(), *serving, servingCellFields);
 }
 

@@ -1,7 +1,6 @@
 #include "LogGenerator/OstrelGSM/UMTSSet.h"
 
 #include "LogGenerator/CellFields.h"
-#include "LogGenerator/ExtraPayload.h"
 #include "Platform/SystemLog.h"
 #include "Platform/TelephonyService.h"
 
@@ -34,6 +33,8 @@ constexpr CellField knownFields[] = {
     {kVoxCellMonitorECN0, CellNumber::SignedLow16, "Energy Per Chip",
      unless(levelNotMeasured, "", integer("%d dB")), "UMTSSet: Failed to retrieve Energy Per Chip\n"},
 };
+constexpr CellRows known = {{kVoxCellMonitorRadioAccessTechnologyUMTS, kVoxCellMonitorCellTypeNeighbor},
+                            knownFields};
 
 } // namespace
 
@@ -54,24 +55,15 @@ void UMTSSet::showRankedCells(const Record& record) {
                               static_cast<std::size_t>(rankedCount.read(record)));
     if (entries.count() == 0)
         return;
-    replaceElements(rows(entries, ranked, 0x4005));
+    showRows(entries, ranked, 0x4005);
 }
 
 void UMTSSet::showKnownCells(const Data& data) {
     clearElements(); // first, so that the list is empty where the cells cannot be had
-    const CellInfoArrayReader reader(data);
-    const Array* cells = reader.cells();
+    const std::vector<Cell>* cells = cellsOf(data);
     if (!cells)
         return;
-    Array known;
-    for (const Value& cell : *cells) {
-        if (!isCell(cell, kVoxCellMonitorRadioAccessTechnologyUMTS, kVoxCellMonitorCellTypeNeighbor))
-            continue;
-        const DictionaryRef row = makeDictionary();
-        writeCellFields(row.get(), *cell.asDictionary(), knownFields);
-        known.append(row); // even one without a field
-    }
-    replaceElements(known);
+    writeCellRows(array().get(), *cells, known, _knownCells);
 }
 
 } // namespace velmora

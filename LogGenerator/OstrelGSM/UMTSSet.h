@@ -2,6 +2,8 @@
 
 #include "LogGenerator/Base.h"
 
+#include <vector>
+
 namespace velmora {
 
 /// "UMTS Set": the UMTS cells that are ranked for reselection, or the neighbours that the telephony service
@@ -17,6 +19,8 @@ private:
     void showRankedCells(const Record& record);
     /// 0xFF0001: the neighbours that the telephony service knows.
     void showKnownCells(const Data& data);
+
+    std::vector<std::uint8_t> _knownCells; ///< used again for each 0xFF0001
 };
 
 } // namespace velmora

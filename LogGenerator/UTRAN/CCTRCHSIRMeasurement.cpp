@@ -27,6 +27,23 @@ Array ratios(const Record& entry) {
     return result;
 }
 
+CountedList compositeChannels(const Record& record) {
+    const auto transportChannels = static_cast<std::size_t>(quality::transportChannels.read(record));
+    return CountedList(record, quality::firstCompositeChannel(transportChannels),
+                       quality::compositeChannelLength,
+                       static_cast<std::size_t>(quality::compositeChannels.read(record)));
+}
+
+void fill(Array& rows, const Record& record) {
+    const CountedList channels = compositeChannels(record);
+    for (std::size_t i = 0; i < channels.whole(); ++i) {
+        const DictionaryRef row = makeDictionary();
+        writeFields(*row, channels[i], channel);
+        row->set("SIR", std::make_shared<Array>(ratios(channels[i])));
+        rows.append(row);
+    }
+}
+
 } // namespace
 
 void CCTRCHSIRMeasurement::updateWithData(const Data& data, std::uint32_t logCode) {
@@ -35,14 +52,8 @@ void CCTRCHSIRMeasurement::updateWithData(const Data& data, std::uint32_t logCod
     if (logCode != quality::code || record.size() < quality::minimumLength)
         return;
     clearElements();
-    const auto transportChannels = static_cast<std::size_t>(quality::transportChannels.read(record));
-    const CountedList channels(record, quality::firstCompositeChannel(transportChannels),
-                               quality::compositeChannelLength,
-                               static_cast<std::size_t>(quality::compositeChannels.read(record)));
-    const Array shown = rows(channels, channel, logCode);
-    for (std::size_t i = 0; i < shown.size(); ++i)
-        shown[i].asDictionary()->set("SIR", std::make_shared<Array>(ratios(channels[i])));
-    replaceElements(shown);
+    reportMissingEntries(compositeChannels(record), logCode);
+    showElementsWith<fill>(record);
 }
 
 } // namespace velmora

@@ -22,6 +22,11 @@ constexpr Field cellFields[] = {
 };
 constexpr Layout cell = layout(8, cellFields);
 
+CountedList cells(const Record& record) {
+    return CountedList(record, minimumLength, cell.minimumLength,
+                       static_cast<std::size_t>(count.read(record)));
+}
+
 } // namespace
 
 void GSMNeighbhorMeasurements::updateWithData(const Data& data, std::uint32_t logCode) {
@@ -30,14 +35,12 @@ void GSMNeighbhorMeasurements::updateWithData(const Data& data, std::uint32_t lo
     if (logCode != code || record.size() < minimumLength)
         return;
     clearElements();
-    // Discarded: see the header.
-    static_cast<void>(neighbours(record));
+    // The rows are not shown, and so not even made: see the header.
+    reportMissingEntries(cells(record), code);
 }
 
 Array GSMNeighbhorMeasurements::neighbours(const Record& record) {
-    return rows(
-        CountedList(record, minimumLength, cell.minimumLength, static_cast<std::size_t>(count.read(record))),
-        cell, code);
+    return rows(cells(record), cell, code);
 }
 
 } // namespace velmora

@@ -25,7 +25,7 @@ void TRCHBLERMeasurement::updateWithData(const Data& data, std::uint32_t logCode
     clearElements();
     const CountedList channels(record, quality::minimumLength, quality::transportChannelLength,
                                static_cast<std::size_t>(quality::transportChannels.read(record)));
-    replaceElements(rows(channels, channel, logCode));
+    showRows(channels, channel, logCode);
 }
 
 } // namespace velmora

@@ -33,6 +33,22 @@ constexpr Field detectionFields[] = {
 };
 constexpr Layout detection = layout(entryLength, detectionFields);
 
+CountedList cells(const Record& record) {
+    return CountedList(record, firstEntry, entryLength, static_cast<std::size_t>(count.read(record)));
+}
+
+void fill(Array& rows, const Record& record) {
+    const CountedList entries = cells(record);
+    for (std::size_t i = 0; i < entries.whole(); ++i) {
+        const DictionaryRef row = makeDictionary();
+        writeFields(*row, entries[i], cell);
+        if (const auto set = static_cast<std::size_t>(status.read(entries[i])); set < std::size(statusTexts))
+            row->setText("Status", statusTexts[set]);
+        writeFields(*row, entries[i], detection);
+        rows.append(row);
+    }
+}
+
 } // namespace
 
 void UTRANNeighbhorMeasurements::updateWithData(const Data& data, std::uint32_t logCode) {
@@ -41,15 +57,8 @@ void UTRANNeighbhorMeasurements::updateWithData(const Data& data, std::uint32_t 
     if (logCode != 0xD00A || record.size() < minimumLength)
         return;
     clearElements();
-    const CountedList entries(record, firstEntry, entryLength, static_cast<std::size_t>(count.read(record)));
-    const Array cells = rows(entries, cell, logCode);
-    for (std::size_t i = 0; i < cells.size(); ++i) {
-        Dictionary& row = *cells[i].asDictionary();
-        if (const auto set = static_cast<std::size_t>(status.read(entries[i])); set < std::size(statusTexts))
-            row.setText("Status", statusTexts[set]);
-        writeFields(row, entries[i], detection);
-    }
-    replaceElements(cells);
+    reportMissingEntries(cells(record), logCode);
+    showElementsWith<fill>(record);
 }
 
 } // namespace velmora

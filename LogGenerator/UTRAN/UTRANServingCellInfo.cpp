@@ -1,7 +1,6 @@
 #include "LogGenerator/UTRAN/UTRANServingCellInfo.h"
 
 #include "LogGenerator/CellFields.h"
-#include "LogGenerator/ExtraPayload.h"
 #include "Platform/SystemLog.h"
 #include "Platform/TelephonyService.h"
 
@@ -17,7 +16,7 @@ constexpr Field cellFields[] = {
     {"URA ID", u8At(15), integer("%d")},
     {"Allowed Access", bitsAt(25, 0, 1), flag("Emergency Calls Only", "All Calls")},
 };
-constexpr Layout cell = layout(26, cellFields); // 0xD0E2
+constexpr Layout servingCell = layout(26, cellFields); // 0xD0E2
 
 constexpr CellField knownFields[] = {
     {kVoxCellMonitorLAC, CellNumber::Whole, "Local Area Code", integer("%d"),
@@ -30,6 +29,8 @@ constexpr CellField knownFields[] = {
      "Serving Cell Info: Failed to retrieve Cell Scrambling Code\n"},
     {kVoxCellMonitorUARFCN, CellNumber::Whole, "Uplink UARFCN", integer("%d"),
      "Serving Cell Info: Failed to retrieve UARFCN\n"},
+    // The service knows one channel number, which stands under both labels: that is meant.
+    {kVoxCellMonitorUARFCN, CellNumber::Whole, "Downlink UARFCN", integer("%d"), ""},
 };
 
 } // namespace
@@ -37,28 +38,22 @@ constexpr CellField knownFields[] = {
 void UTRANServingCellInfo::updateWithData(const Data& data, std::uint32_t logCode) {
     logLine(LogPriority::Warning, "Serving Cell Info");
     switch (logCode) {
-    case 0xD0E2: show(Record(data), cell); break;
+    case 0xD0E2: show(Record(data), servingCell); break;
     case 0xFF0001: showServingCells(data); break;
     default: break;
     }
 }
 
 void UTRANServingCellInfo::showServingCells(const Data& data) const {
-    const CellInfoArrayReader reader(data);
     // What is no array is passed over without the line that other sections write.
-    const Array* cells = reader.parsed().asArray();
+    const std::vector<Cell>* cells = readCells(data);
     if (!cells)
         return;
+    constexpr CellKind serving(kVoxCellMonitorRadioAccessTechnologyUTRAN, kVoxCellMonitorCellTypeServing);
     const DictionaryRef node = dictionary();
-    for (const Value& each : *cells) {
-        if (!isCell(each, kVoxCellMonitorRadioAccessTechnologyUTRAN, kVoxCellMonitorCellTypeServing))
-            continue;
-        const Dictionary& fields = *each.asDictionary();
-        writeCellFields(node.get(), fields, knownFields);
-        // The service knows one channel number, which stands under both labels: that is meant.
-        if (const auto uarfcn = cellNumber(fields, kVoxCellMonitorUARFCN); uarfcn && node)
-            writeValue(*node, "Downlink UARFCN", integer("%d"), *uarfcn);
-    }
+    for (const Cell& cell : *cells)
+        if (cell.kind == serving)
+            writeCellFields(node.get(), cell, knownFields);
 }
 
 } // namespace velmora

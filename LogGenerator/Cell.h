@@ -1,0 +1,85 @@
+#pragma once
+
+#include "Platform/TelephonyService.h"
+
+#include <array>
+#include <cstddef>
+#include <cstdint>
+#include <iterator>
+#include <limits>
+#include <optional>
+#include <string_view>
+
+namespace velmora {
+
+/// The place of a text in a list of texts; the list's length where it is not among them.
+template <std::size_t N>
+constexpr std::uint8_t placeOf(std::string_view text, const std::string_view (&texts)[N]) {
+    std::uint8_t place = 0;
+    while (place < N && texts[place] != text)
+        ++place;
+    return place;
+}
+
+/// The telephony service's keys for the numbers of a cell, of which a section may ask.
+inline constexpr std::string_view cellNumberKeys[] = {
+    kVoxCellMonitorMCC,      kVoxCellMonitorMNC,   kVoxCellMonitorLAC,    kVoxCellMonitorTAC,
+    kVoxCellMonitorCellId,   kVoxCellMonitorARFCN, kVoxCellMonitorUARFCN, kVoxCellMonitorPID,
+    kVoxCellMonitorSCN,      kVoxCellMonitorRSSI,  kVoxCellMonitorRSCP,   kVoxCellMonitorECN0,
+    kVoxCellMonitorBandInfo,
+};
+inline constexpr std::size_t cellNumberCount = std::size(cellNumberKeys);
+inline constexpr std::string_view cellTechnologies[] = {
+    kVoxCellMonitorRadioAccessTechnologyGSM,
+    kVoxCellMonitorRadioAccessTechnologyUMTS,
+    kVoxCellMonitorRadioAccessTechnologyUTRAN,
+    kVoxCellMonitorRadioAccessTechnologyLTE,
+};
+inline constexpr std::string_view cellTypes[] = {kVoxCellMonitorCellTypeServing,
+                                                 kVoxCellMonitorCellTypeNeighbor};
+
+/// One of those keys; any other does not compile.
+struct CellKey {
+    std::uint8_t place;
+
+    consteval CellKey(std::string_view key) : place(placeOf(key, cellNumberKeys)) {
+        if (place == cellNumberCount)
+            throw "a key that is none of a cell's numbers";
+    }
+};
+
+/// A radio access technology and a cell type.
+struct CellKind {
+    std::uint8_t technology = std::size(cellTechnologies); ///< none of the known ones
+    std::uint8_t type = std::size(cellTypes);
+
+    CellKind() = default;
+    consteval CellKind(std::string_view technologyText, std::string_view typeText)
+        : technology(placeOf(technologyText, cellTechnologies)), type(placeOf(typeText, cellTypes)) {
+        if (technology == std::size(cellTechnologies) || type == std::size(cellTypes))
+            throw "an unknown technology or type";
+    }
+    friend bool operator==(const CellKind& a, const CellKind& b) = default;
+};
+
+/// What sections read of one cell of the cell information array.
+struct Cell {
+    CellKind kind;
+    std::uint32_t present = 0; ///< bit by bit, which numbers it has
+    std::array<std::int32_t, cellNumberCount> numbers;
+
+    [[nodiscard]] std::optional<std::int32_t> number(CellKey key) const {
+        return (present >> key.place & 1) != 0 ? std::optional(numbers[key.place]) : std::nullopt;
+    }
+    /// Takes a number in; one that 32 bits do not hold is none.
+    void setNumber(std::size_t place, std::int64_t number) {
+        const bool fits = number >= std::numeric_limits<std::int32_t>::min() &&
+                          number <= std::numeric_limits<std::int32_t>::max();
+        numbers[place] = static_cast<std::int32_t>(number);
+        present = (present & ~(1u << place)) | std::uint32_t{fits} << place;
+    }
+    /// What stands there is no number.
+    void setNoNumber(std::size_t place) { present &= ~(1u << place); }
+};
+
+} // namespace velmora

@@ -1,0 +1,31 @@
+#pragma once
+
+#include "LogGenerator/Cell.h"
+#include "LogGenerator/XMLCellReader.h"
+#include "Platform/Bytes.h"
+
+#include <cstdint>
+#include <vector>
+
+namespace velmora {
+
+/// The cell information array of the record that came last, read once for all sections that want it. Shared
+/// by the sections of a class index.
+class CellList {
+public:
+    /// The cells of the record, in the list's order, but what is no cell; null where the payload holds no
+    /// array or cannot be read, which then is logged as CellInfoArrayReader does. Valid until the next call.
+    [[nodiscard]] const std::vector<Cell>* read(const Data& record);
+
+private:
+    [[nodiscard]] bool readSlowly(const Data& record);
+
+    std::vector<std::uint8_t> _payload; ///< that `_cells` were read from; empty before
+    std::vector<Cell> _cells;
+    XMLCellReader _xmlReader;
+};
+
+/// The first cell of that kind, or null.
+[[nodiscard]] const Cell* firstCell(const std::vector<Cell>& cells, const CellKind& kind);
+
+} // namespace velmora
