@@ -11,6 +11,15 @@ constexpr std::size_t minimumLength = 25; // the pilots follow
 constexpr std::size_t countAt = 15;
 constexpr std::size_t pilotLength = 12;
 
+/// Of the entries.
+Value pilotsOf(Bytes bytes, const void*) {
+    PilotList pilots;
+    const CountedList entries(Record(bytes), 0, pilotLength, bytes.size() / pilotLength);
+    for (std::size_t i = 0; i < entries.count(); ++i)
+        pilots.add(i, entries[i].u16(0), decibelsOf512ths(entries[i].u16(2)));
+    return pilots.valueOrNone();
+}
+
 } // namespace
 
 void ActiveSetPilots::parse(const Record& record, Dictionary&, const Publisher& publisher) const {
@@ -25,13 +34,8 @@ void ActiveSetPilots::parse(const Record& record, Dictionary&, const Publisher& 
                   lengthOf(record), static_cast<int>(count));
         return;
     }
-    PilotList pilots;
-    const CountedList entries(record, minimumLength, pilotLength, count);
-    for (std::size_t i = 0; i < count; ++i) {
-        const Record pilot = entries[i];
-        pilots.add(i, pilot.u16(0), decibelsOf512ths(pilot.u16(2)));
-    }
-    publisher.publish("kActiveSetPilots", pilots.valueOrNone());
+    publisher.publishLater("kActiveSetPilots", pilotsOf, nullptr,
+                           record.part(minimumLength, pilotLength * count).bytes());
 }
 
 } // namespace velmora::C2K

@@ -12,6 +12,18 @@ constexpr std::size_t countAt = 22;
 constexpr std::size_t fingerLength = 14;
 constexpr std::uint16_t unassigned = 0xFFFF;
 
+/// Of the entries.
+Value fingersOf(Bytes bytes, const void*) {
+    PilotList fingers;
+    const CountedList entries(Record(bytes), 0, fingerLength, bytes.size() / fingerLength);
+    for (std::size_t i = 0; i < entries.count(); ++i) {
+        const Record finger = entries[i];
+        if (const std::uint16_t pnOffset = finger.u16(0); pnOffset != unassigned)
+            fingers.add(i, pnOffset, decibelsOf512ths(finger.u16(6)));
+    }
+    return fingers.valueOrNone();
+}
+
 } // namespace
 
 void FingerC2I::parse(const Record& record, Dictionary&, const Publisher& publisher) const {
@@ -29,14 +41,8 @@ void FingerC2I::parse(const Record& record, Dictionary&, const Publisher& publis
                   lengthOf(record), static_cast<int>(count), minimum);
         return;
     }
-    PilotList fingers;
-    const CountedList entries(record, minimumLength, fingerLength, count);
-    for (std::size_t i = 0; i < count; ++i) {
-        const Record finger = entries[i];
-        if (const std::uint16_t pnOffset = finger.u16(0); pnOffset != unassigned)
-            fingers.add(i, pnOffset, decibelsOf512ths(finger.u16(6)));
-    }
-    publisher.publish("kFingerC2I", fingers.valueOrNone());
+    publisher.publishLater("kFingerC2I", fingersOf, nullptr,
+                           record.part(minimumLength, fingerLength * count).bytes());
 }
 
 } // namespace velmora::C2K

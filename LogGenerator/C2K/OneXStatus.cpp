@@ -49,6 +49,11 @@ constexpr ValueField radioFields[] = {
     {"k1xTxAGC", i16At(12), real("%+.2f dBm", 0.1), When::Connected},
 };
 
+/// Of the sub-packet.
+Value pilotsOf(Bytes bytes, const void*) {
+    return ActiveSetInfo(Record(bytes)).pilots();
+}
+
 } // namespace
 
 void OneXStatus::parse(const Record& record, Dictionary& state, const Publisher& publisher) const {
@@ -86,7 +91,8 @@ void OneXStatus::parse(const Record& record, Dictionary& state, const Publisher&
 
     publishFields(publisher, subPackets.from(system), systemStateFields, traffic);
     publishFields(publisher, subPackets.from(radio), radioFields, traffic);
-    publisher.publish("k1xActiveSetInfo", activeSetInfo.pilots());
+    publisher.publishLater("k1xActiveSetInfo", pilotsOf, nullptr,
+                           record.part(active.offset, activeSetInfo.neededLength()).bytes());
     if (traffic)
         return;
     FrameErrorAverage average(state);

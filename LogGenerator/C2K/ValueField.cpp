@@ -2,12 +2,17 @@
 
 #include <array>
 #include <cstdio>
+#include <cstring>
 
 namespace velmora::C2K {
 
 namespace {
 
-Value shownValue(const ValueField& field, std::int64_t raw) {
+/// `table`: the field; `bytes`: its raw value.
+Value shownValue(Bytes bytes, const void* table) {
+    const auto& field = *static_cast<const ValueField*>(table);
+    std::int64_t raw = 0;
+    std::memcpy(&raw, bytes.data(), sizeof raw);
     switch (field.shown.kind) {
     case Shown::Kind::Texts: return (*field.shown.texts)[static_cast<std::uint32_t>(raw)];
     case Shown::Kind::Hexadecimal: {
@@ -27,10 +32,14 @@ Value shownValue(const ValueField& field, std::int64_t raw) {
 void publishFields(const Publisher& publisher, const Record& record, std::span<const ValueField> fields,
                    bool connected) {
     for (const ValueField& field : fields) {
-        if (connected || field.when == When::Always)
-            publisher.publish(field.key, shownValue(field, field.where.read(record)));
-        else
+        if (!connected && field.when != When::Always) {
             publisher.publish(field.key, "N/A");
+            continue;
+        }
+        const std::int64_t raw = field.where.read(record);
+        std::array<std::uint8_t, sizeof raw> bytes;
+        std::memcpy(bytes.data(), &raw, sizeof raw);
+        publisher.publishLater(field.key, shownValue, &field, bytes);
     }
 }
 

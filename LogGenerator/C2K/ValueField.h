@@ -52,8 +52,8 @@ constexpr std::size_t endOf(std::span<const ValueField> fields, bool connected) 
     return end;
 }
 
-/// Publishes every field, in table order. Precondition: the record (or the rest of it, for a sub-packet's
-/// fields) reaches to endOf(fields, connected).
+/// Publishes every field, in table order. The fields must be a constant. Precondition: the record (or the
+/// rest of it, for a sub-packet's fields) reaches to endOf(fields, connected).
 void publishFields(const Publisher& publisher, const Record& record, std::span<const ValueField> fields,
                    bool connected);
 
