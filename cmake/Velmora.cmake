@@ -37,6 +37,11 @@ function(velmora_library name)
     target_link_libraries(${name} PUBLIC velmora_options ${arg_LINK})
 endfunction()
 
+# velmora_compile_quickly(NAME): for what is run a few times at most; optimizing it takes longer than it saves.
+function(velmora_compile_quickly name)
+    target_compile_options(${name} PRIVATE "$<$<CONFIG:Release,RelWithDebInfo>:-O1;-g1>")
+endfunction()
+
 # velmora_test(NAME SOURCES file... [LINK target...] [NEEDS program...]): a GoogleTest executable whose cases
 # CTest runs one by one. NEEDS builds programs that the cases start, so that one target builds all a test needs.
 function(velmora_test name)
@@ -46,6 +51,7 @@ function(velmora_test name)
     target_link_libraries(${name} PRIVATE velmora_options ${arg_LINK} GTest::gtest GTest::gmock)
     target_compile_definitions(${name} PRIVATE VELMORA_SOURCE_DIR="${PROJECT_SOURCE_DIR}"
                                VELMORA_BUILD_DIR="${CMAKE_BINARY_DIR}")
+    velmora_compile_quickly(${name})
     if(arg_NEEDS)
         add_dependencies(${name} ${arg_NEEDS})
     endif()
@@ -80,6 +86,7 @@ function(velmora_header_check)
         endif()
     endforeach()
     add_library(header-check OBJECT ${sources})
+    velmora_compile_quickly(header-check)
     target_link_libraries(header-check PRIVATE velmora_options velmora_app velmora_tools velmora_telephony
                           velmora_test_support GTest::gtest GTest::gmock Qt6::Test Qt6::Widgets)
 endfunction()
