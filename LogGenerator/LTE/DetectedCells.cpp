@@ -1,8 +1,5 @@
 #include "LogGenerator/LTE/DetectedCells.h"
 
-#include "LogGenerator/LTE/Records.h"
-#include "Platform/SystemLog.h"
-
 namespace velmora {
 
 using LTE::IntraFrequencyRecord;
@@ -16,19 +13,6 @@ constexpr Layout cell = layout(IntraFrequencyRecord::detectedLength, cellFields)
 
 } // namespace
 
-void DetectedCells::updateWithData(const Data& data, std::uint32_t logCode) {
-    logLine(LogPriority::Warning, getSectionName());
-    if (logCode != IntraFrequencyRecord::code) {
-        unknownLogMessage(logCode);
-        return;
-    }
-    const Record record(data);
-    if (record.size() < IntraFrequencyRecord::minimumLength)
-        return;
-    clearElements();
-    const IntraFrequencyRecord measurement(record);
-    if (measurement.detected().count() > 0)
-        showRows(measurement.detected(), cell, logCode);
-}
+DetectedCells::DetectedCells() : IntraFrequencyList(&IntraFrequencyRecord::detected, cell) {}
 
 } // namespace velmora

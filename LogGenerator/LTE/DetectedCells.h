@@ -1,15 +1,14 @@
 #pragma once
 
-#include "LogGenerator/Base.h"
+#include "LogGenerator/LTE/IntraFrequencyList.h"
 
 namespace velmora {
 
 /// "Detected Cells": one row per further cell that connected mode found on the serving frequency.
-class DetectedCells final : public Base {
+class DetectedCells final : public IntraFrequencyList {
 public:
+    DetectedCells();
     [[nodiscard]] std::string_view getSectionName() const override { return "Detected Cells"; }
-    [[nodiscard]] std::vector<std::uint32_t> getLogCodeArray() const override { return {0xB179}; }
-    void updateWithData(const Data& data, std::uint32_t logCode) override;
 };
 
 } // namespace velmora

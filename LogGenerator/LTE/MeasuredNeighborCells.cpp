@@ -1,8 +1,5 @@
 #include "LogGenerator/LTE/MeasuredNeighborCells.h"
 
-#include "LogGenerator/LTE/Records.h"
-#include "Platform/SystemLog.h"
-
 namespace velmora {
 
 using LTE::IntraFrequencyRecord;
@@ -18,19 +15,7 @@ constexpr Layout cell = layout(IntraFrequencyRecord::neighbourLength, cellFields
 
 } // namespace
 
-void MeasuredNeighborCells::updateWithData(const Data& data, std::uint32_t logCode) {
-    logLine(LogPriority::Warning, getSectionName());
-    if (logCode != IntraFrequencyRecord::code) {
-        unknownLogMessage(logCode);
-        return;
-    }
-    const Record record(data);
-    if (record.size() < IntraFrequencyRecord::minimumLength)
-        return;
-    clearElements();
-    const IntraFrequencyRecord measurement(record);
-    if (measurement.neighbours().count() > 0)
-        showRows(measurement.neighbours(), cell, logCode);
-}
+MeasuredNeighborCells::MeasuredNeighborCells()
+    : IntraFrequencyList(&IntraFrequencyRecord::neighbours, cell) {}
 
 } // namespace velmora

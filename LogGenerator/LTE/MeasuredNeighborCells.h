@@ -1,15 +1,14 @@
 #pragma once
 
-#include "LogGenerator/Base.h"
+#include "LogGenerator/LTE/IntraFrequencyList.h"
 
 namespace velmora {
 
 /// "Measured Neighbor Cells": one row per neighbour that connected mode measures on the serving frequency.
-class MeasuredNeighborCells final : public Base {
+class MeasuredNeighborCells final : public IntraFrequencyList {
 public:
+    MeasuredNeighborCells();
     [[nodiscard]] std::string_view getSectionName() const override { return "Measured Neighbor Cells"; }
-    [[nodiscard]] std::vector<std::uint32_t> getLogCodeArray() const override { return {0xB179}; }
-    void updateWithData(const Data& data, std::uint32_t logCode) override;
 };
 
 } // namespace velmora

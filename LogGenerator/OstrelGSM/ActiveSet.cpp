@@ -1,7 +1,6 @@
 #include "LogGenerator/OstrelGSM/ActiveSet.h"
 
 #include "LogGenerator/OstrelGSM/SearcherRecord.h"
-#include "Platform/SystemLog.h"
 
 namespace velmora {
 
@@ -31,16 +30,7 @@ void fill(Array& rows, const Record& record) {
 
 } // namespace
 
-void ActiveSet::updateWithData(const Data& data, std::uint32_t logCode) {
-    logLine(LogPriority::Warning, "ActiveSet");
-    if (logCode != SearcherRecord::code) {
-        unknownLogMessage(logCode);
-        return;
-    }
-    const Record record(data);
-    if (record.size() < SearcherRecord::minimumLength)
-        return;
-    clearElements();
+void ActiveSet::showCells(const Record& record, std::uint32_t logCode) {
     const SearcherRecord searcher(record);
     if (searcher.cells().count() == 0)
         return;

@@ -1,16 +1,16 @@
 #pragma once
 
-#include "LogGenerator/Base.h"
+#include "LogGenerator/OstrelGSM/SearcherSet.h"
 
 namespace velmora {
 
-/// "Virtual Active Set": the UMTS searcher's virtual active set. No cell is ever put into it: the section
-/// empties its list, and that is meant.
-class VirtualActiveSet final : public Base {
+/// "Virtual Active Set": the UMTS searcher's virtual active set. No cell is ever put into it.
+class VirtualActiveSet final : public SearcherSet {
 public:
     [[nodiscard]] std::string_view getSectionName() const override { return "Virtual Active Set"; }
-    [[nodiscard]] std::vector<std::uint32_t> getLogCodeArray() const override { return {0x417A}; }
-    void updateWithData(const Data& data, std::uint32_t logCode) override;
+
+protected:
+    [[nodiscard]] std::string_view traceName() const override { return "VirtualActiveSet"; }
 };
 
 } // namespace velmora

@@ -1,4 +1,4 @@
-#include "LogGenerator/OstrelGSM/DetectedSet.h"
+#include "LogGenerator/OstrelGSM/SearcherSet.h"
 
 #include "LogGenerator/OstrelGSM/SearcherRecord.h"
 #include "Platform/SystemLog.h"
@@ -7,8 +7,8 @@ namespace velmora {
 
 using OstrelGSM::SearcherRecord;
 
-void DetectedSet::updateWithData(const Data& data, std::uint32_t logCode) {
-    logLine(LogPriority::Warning, "DetectedSet");
+void SearcherSet::updateWithData(const Data& data, std::uint32_t logCode) {
+    logLine(LogPriority::Warning, traceName());
     if (logCode != SearcherRecord::code) {
         unknownLogMessage(logCode);
         return;
@@ -17,6 +17,10 @@ void DetectedSet::updateWithData(const Data& data, std::uint32_t logCode) {
     if (record.size() < SearcherRecord::minimumLength)
         return;
     clearElements();
+    showCells(record, logCode);
+}
+
+void SearcherSet::showCells(const Record& record, std::uint32_t logCode) {
     // Whatever set a cell is of, it gives no row here.
     reportMissingEntries(SearcherRecord(record).cells(), logCode);
 }

@@ -1,0 +1,24 @@
+#include "LogGenerator/LTE/IntraFrequencyList.h"
+
+#include "Platform/SystemLog.h"
+
+namespace velmora {
+
+using LTE::IntraFrequencyRecord;
+
+void IntraFrequencyList::updateWithData(const Data& data, std::uint32_t logCode) {
+    logLine(LogPriority::Warning, getSectionName());
+    if (logCode != IntraFrequencyRecord::code) {
+        unknownLogMessage(logCode);
+        return;
+    }
+    const Record record(data);
+    if (record.size() < IntraFrequencyRecord::minimumLength)
+        return;
+    clearElements();
+    const IntraFrequencyRecord measurement(record);
+    if (const CountedList& cells = (measurement.*_cells)(); cells.count() > 0)
+        showRows(cells, _cell, logCode);
+}
+
+} // namespace velmora
