@@ -33,7 +33,7 @@ public:
 
 private:
     QtMainQueue _queue;
-    LinuxMessagePorts _ports;
+    LinuxMessagePorts _ports{PortOptions::forClients()};
     LinuxTelephonyService _telephony{_ports};
     MachineClock _clock;
     LinuxFileSystem _files;

@@ -2,6 +2,7 @@
 #include "App/SelfTest.h"
 #include "App/VelmoraApp.h"
 #include "Platform/Linux/FileResources.h"
+#include "Platform/Linux/LargeMemory.h"
 #include "Platform/Linux/LinuxFileSystem.h"
 #include "Platform/Linux/ProgramLog.h"
 #include "Platform/Linux/ServiceStarter.h"
@@ -94,6 +95,7 @@ int show(const Options& options, char* program) {
 
 int main(int argc, char** argv) {
     endOnUncaughtExceptions("velmora");
+    giveBackLargeMemory();
     Options options;
     CLI::App app;
     declare(app, options);

@@ -74,13 +74,19 @@ std::string whyRefused(const ConvertOptions& options) {
 
 /// Whether all of the input is in the output now.
 bool convert(const ConvertOptions& options, MessageReader& reader, const std::string& title) {
+    // Before the draft, so that no moment is left in which memory that cannot be had would leave one behind.
+    FileDraft* made = nullptr;
+    WorkContext context(title, [&made] {
+        if (made)
+            made->discard();
+    });
     Result<FileDraft> draft = FileDraft::create(options.out, newFileMode);
     if (!draft) {
         report(options.out + ": " + draft.reason());
         return false;
     }
+    made = &*draft;
     const RemovedWhenInterrupted removed(draft->path());
-    WorkContext context(title, [&draft] { draft->discard(); });
     Conversion conversion;
     conversion.form = *formFromName(options.out);
     conversion.title = title;

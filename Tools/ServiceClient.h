@@ -14,7 +14,7 @@ class ServiceClient {
 public:
     MainLoop loop;
     QtMainQueue queue;
-    LinuxMessagePorts ports;
+    LinuxMessagePorts ports{PortOptions::forClients()};
     LinuxTelephonyService telephony{ports};
     MachineClock clock;
 

@@ -1,5 +1,6 @@
 #include "Tools/WatchCommand.h"
 
+#include "Platform/Linux/LargeMemory.h"
 #include "Platform/Linux/SignalWatcher.h"
 #include "Tools/ExitStatus.h"
 #include "Tools/Output.h"
@@ -121,6 +122,7 @@ private:
 } // namespace
 
 int runWatch(const WatchOptions& options, Output& output) {
+    giveBackLargeMemory();
     ServiceClient client;
     const int status = Watcher(options, output, client).run();
     return output.state() == Output::State::Failed ? ExitStatus::BadInput : status;

@@ -39,11 +39,14 @@ bool rename(const std::string& from, const std::filesystem::path& to, FileDraft:
 } // namespace
 
 Result<FileDraft> FileDraft::create(const std::filesystem::path& target, mode_t mode) {
+    // From the moment that there is a file until somebody has the draft nothing here may throw: nobody would
+    // know of the file.
     std::string path = target.string() + ".XXXXXX";
-    FileDescriptor file(::mkostemp(path.data(), O_CLOEXEC));
-    if (!file)
+    FileDraft draft(target, {}, {});
+    draft._file = FileDescriptor(::mkostemp(path.data(), O_CLOEXEC));
+    if (!draft._file)
         return Failure{"cannot be opened for writing: " + errnoText(errno)};
-    FileDraft draft(target, std::move(path), std::move(file));
+    draft._path = std::move(path);
     struct stat earlier = {};
     const bool existed = ::stat(target.c_str(), &earlier) == 0;
     if (::fchmod(draft.descriptor(), existed ? earlier.st_mode & 07777 : mode & ~maskOfProcess()) != 0)

@@ -12,6 +12,7 @@
 #include <algorithm>
 #include <cerrno>
 #include <cinttypes>
+#include <thread>
 #include <utility>
 
 namespace velmora {
@@ -23,6 +24,7 @@ using SteadyClock = std::chrono::steady_clock;
 /// Messages, or bytes, that wait before `post` writes without waiting for the event loop.
 constexpr std::size_t batchMessages = 64;
 constexpr std::size_t batchBytes = std::size_t{128} << 10;
+constexpr auto restartPollInterval = std::chrono::milliseconds(10);
 
 SteadyClock::time_point deadlineAfter(std::chrono::nanoseconds time) {
     constexpr std::chrono::nanoseconds longest = std::chrono::hours(24 * 365); // the sum must not overflow
@@ -45,6 +47,14 @@ bool waitFor(int descriptor, short events, SteadyClock::time_point deadline) {
     }
 }
 
+/// 0, or the errno value.
+int connectTo(const PortAddress& address, int descriptor) {
+    while (::connect(descriptor, reinterpret_cast<const sockaddr*>(&address.address), address.size) != 0)
+        if (errno != EINTR)
+            return errno;
+    return 0;
+}
+
 } // namespace
 
 Result<std::shared_ptr<LinuxRemotePort>> LinuxRemotePort::connect(const std::string& name,
@@ -63,17 +73,21 @@ Result<std::shared_ptr<LinuxRemotePort>> LinuxRemotePort::connect(const std::str
     const timeval time = {microseconds / 1'000'000, microseconds % 1'000'000};
     ::setsockopt(socket.get(), SOL_SOCKET, SO_SNDTIMEO, &time, sizeof time);
     const PortAddress address = directory->addressOf(name);
-    int connected;
-    do
-        connected =
-            ::connect(socket.get(), reinterpret_cast<const sockaddr*>(&address.address), address.size);
-    while (connected != 0 && errno == EINTR);
-    if (connected != 0 && (errno == ENOENT || errno == ECONNREFUSED))
+    int error = connectTo(address, socket.get());
+    // A socket that nobody listens on is what a crash leaves. A new owner takes it away before it makes its
+    // own.
+    const auto deadline =
+        deadlineAfter(error == ECONNREFUSED ? options.restartPatience : SteadyClock::duration::zero());
+    while ((error == ECONNREFUSED || error == ENOENT) && SteadyClock::now() < deadline) {
+        std::this_thread::sleep_for(restartPollInterval);
+        error = connectTo(address, socket.get());
+    }
+    if (error == ENOENT || error == ECONNREFUSED)
         return std::shared_ptr<LinuxRemotePort>();
-    if (connected != 0 && errno == EAGAIN)
+    if (error == EAGAIN)
         return Failure{"the peer did not take the connection in time"};
-    if (connected != 0)
-        return Failure{"cannot be connected to: " + errnoText(errno)};
+    if (error != 0)
+        return Failure{"cannot be connected to: " + errnoText(error)};
     if (auto checked = checkPeerUser(socket.get(), options.peerUser); !checked)
         return Failure{checked.reason()};
     if (::fcntl(socket.get(), F_SETFL, O_NONBLOCK) != 0)

@@ -25,6 +25,17 @@ struct PortOptions {
     std::size_t maximumConnections = 64;
     /// How long connecting may block when the peer's queue of new connections is full.
     std::chrono::nanoseconds connectTimeout = std::chrono::seconds(1);
+    /// How long connecting may block when the port's owner has crashed, in case that is just being started
+    /// again.
+    std::chrono::nanoseconds restartPatience{0};
+
+    /// For clients of a service. The next attempt is theirs to make seconds later, which a service that is
+    /// back within a moment is worth blocking for.
+    [[nodiscard]] static PortOptions forClients() {
+        PortOptions options;
+        options.restartPatience = std::chrono::milliseconds(500);
+        return options;
+    }
 
     [[nodiscard]] Result<PortDirectory> openDirectory() const {
         return directory ? PortDirectory::open(*directory, S_IWGRP | S_IWOTH) : PortDirectory::openStandard();

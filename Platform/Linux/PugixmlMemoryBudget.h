@@ -14,6 +14,7 @@ public:
         : _allocate(pugi::get_memory_allocation_function()),
           _deallocate(pugi::get_memory_deallocation_function()) {
         left = bytes;
+        exhausted = false;
         allocate = _allocate;
         pugi::set_memory_management_functions(&allocateWithin, _deallocate);
     }
@@ -21,8 +22,12 @@ public:
     PugixmlMemoryBudget(const PugixmlMemoryBudget&) = delete;
     PugixmlMemoryBudget& operator=(const PugixmlMemoryBudget&) = delete;
 
+    /// Whether it wanted more; where it got none all the same, the machine had none.
+    [[nodiscard]] bool isExhausted() const { return exhausted; }
+
 private:
     static void* allocateWithin(std::size_t size) {
+        exhausted = exhausted || size > left;
         if (size > left)
             return nullptr;
         left -= size;
@@ -30,6 +35,7 @@ private:
     }
 
     static inline std::size_t left = 0;
+    static inline bool exhausted = false;
     static inline pugi::allocation_function allocate = nullptr;
 
     pugi::allocation_function _allocate;

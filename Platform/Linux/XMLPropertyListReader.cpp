@@ -8,6 +8,7 @@
 #include <algorithm>
 #include <cctype>
 #include <limits>
+#include <new>
 #include <string_view>
 
 namespace velmora {
@@ -109,6 +110,8 @@ bool Reader::parse() {
         _document.load_buffer_inplace(_text.data(), _text.size() + 1, options, pugi::encoding_utf8);
     if (result)
         return true;
+    if (result.status == pugi::status_out_of_memory && !budget.isExhausted())
+        throw std::bad_alloc();
     if (result.status == pugi::status_out_of_memory)
         return fail("the list has more tags and attributes than " + std::to_string(_limits.maximumObjects) +
                     " objects need");

@@ -9,6 +9,7 @@
 
 #include <cerrno>
 #include <csignal>
+#include <thread>
 
 /// Ports between processes, and what is left when one of them crashes.
 
@@ -68,6 +69,65 @@ TEST_F(LinuxPortTest, AnotherUsersProcessIsRefused) {
     EXPECT_THAT(_messages, IsEmpty());
     EXPECT_THAT(_log.lines(), ElementsAre(CapturedLog::Line{
                                   3, "Message port in: refused a peer of user 65534, wanted user 0"}));
+}
+
+TEST_F(LinuxPortTest, AnotherUsersPortIsRefused) {
+    constexpr uid_t nobody = 65534;
+    if (::geteuid() != 0)
+        GTEST_SKIP() << "only root can run a process as another user";
+    int ready[2];
+    ASSERT_EQ(::pipe(ready), 0);
+    const pid_t stranger = ::fork();
+    ASSERT_GE(stranger, 0);
+    if (stranger == 0) {
+        // The directory keeps him out, so that the name is made before he is a stranger. The connection
+        // belongs to who listens.
+        const FileDescriptor socket = rawServer("out");
+        if (::setgroups(0, nullptr) != 0 || ::setgid(nobody) != 0 || ::setuid(nobody) != 0 ||
+            ::listen(socket.get(), 8) != 0 || ::write(ready[1], "", 1) != 1)
+            ::_exit(1);
+        // Ends with 0 when the client has turned away without a word.
+        const FileDescriptor client(::accept(socket.get(), nullptr, nullptr));
+        char byte = 0;
+        ::_exit(::recv(client.get(), &byte, 1, 0) == 0 ? 0 : 2);
+    }
+    ::close(ready[1]);
+    char byte = 0;
+    ASSERT_EQ(::read(ready[0], &byte, 1), 1);
+    ::close(ready[0]);
+    EXPECT_EQ(LinuxMessagePorts(_options).createRemote("out"), nullptr);
+    int status = 0;
+    ASSERT_EQ(::waitpid(stranger, &status, 0), stranger);
+    EXPECT_TRUE(WIFEXITED(status));
+    EXPECT_EQ(WEXITSTATUS(status), 0);
+    EXPECT_THAT(_log.lines(),
+                ElementsAre(CapturedLog::Line{3, "Message port out: a peer of user 65534, wanted user 0"}));
+}
+
+TEST_F(LinuxPortTest, AnOwnerThatIsStartedAgainAfterACrashIsWaitedFor) {
+    EchoProcess crashed(_directory.path().string(), "echo");
+    crashed.kill();
+    EXPECT_FALSE(LinuxMessagePorts(_options).createRemote("echo")) << "not unless it is asked for";
+    _options.restartPatience = 10s;
+    std::optional<EchoProcess> again;
+    std::thread starter([&] {
+        std::this_thread::sleep_for(30ms); // by then it is waited for, most likely
+        again.emplace(_directory.path().string(), "echo");
+    });
+    const auto port = LinuxMessagePorts(_options).createRemote("echo");
+    starter.join();
+    ASSERT_TRUE(port);
+    EXPECT_EQ(port->sendRequest(0, dataOf("one"), 5s, 5s, true).status, 0);
+}
+
+TEST_F(LinuxPortTest, AnOwnerThatHasEndedOrStaysAwayIsNotWaitedForLonger) {
+    _options.restartPatience = 1h;
+    EXPECT_FALSE(LinuxMessagePorts(_options).createRemote("never")) << "no crash";
+    EchoProcess crashed(_directory.path().string(), "echo");
+    crashed.kill();
+    _options.restartPatience = 50ms;
+    EXPECT_FALSE(LinuxMessagePorts(_options).createRemote("echo"));
+    EXPECT_THAT(_log.lines(), IsEmpty());
 }
 
 TEST_F(LinuxPortTest, AStoppedProcessRunsIntoTheTimeOutAndItsAnswerIsLate) {

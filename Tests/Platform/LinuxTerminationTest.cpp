@@ -24,7 +24,7 @@ TEST_P(LinuxTerminationTest, EndsTheProgramWithAWordAndAStatus) {
     EXPECT_EXIT(
         {
             endOnUncaughtExceptions("tool");
-            [this]() noexcept { GetParam().fail(); }();
+            []() noexcept { GetParam().fail(); }();
         },
         testing::ExitedWithCode(1), GetParam().lastWords);
 }

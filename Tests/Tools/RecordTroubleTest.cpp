@@ -43,7 +43,7 @@ TEST_F(RecordTroubleTest, FileThatMayNotGrowIsWrittenWhenItMay) {
     for (std::uint8_t state = 2; state <= 4; ++state)
         _service->send(rrState(state));
     ASSERT_TRUE(process.waitForError("velmora-log: " + _waiting + "\n"));
-    EXPECT_THAT(process.errors(), testing::HasSubstr("<3>" + _waiting + "\n")) << "in the log as well";
+    EXPECT_TRUE(process.waitForError("<3>" + _waiting + "\n")) << "in the log as well";
     EXPECT_EQ(size(), before + 52);
     EXPECT_THAT(messagesOf("drive.pcapng", "Ostrel_GSM"), ElementsAre(rrState(1), rrState(2)));
     _service->send(rrState(5));
@@ -112,7 +112,7 @@ TEST_F(RecordTroubleTest, ServiceThatGoesAndComesBackIsTold) {
     ASSERT_TRUE(fileHolds(1));
     _service.reset();
     ASSERT_TRUE(process.waitForError("velmora-log: " + _gone + "\n"));
-    EXPECT_THAT(process.errors(), testing::HasSubstr("<3>" + _gone + "\n")) << "in the log as well";
+    EXPECT_TRUE(process.waitForError("<3>" + _gone + "\n")) << "in the log as well";
     startService();
     ASSERT_TRUE(process.waitForError("velmora-log: the telephony service is back\n"));
     ASSERT_TRUE(isStreaming());
