@@ -299,7 +299,9 @@ TEST_F(SIMAndBearersTest, partsThatCannotBeReadAreToldOnceAndTriedAgain) {
     EXPECT_EQ(at(latest(contextCode), {"0", "Bearer"}), Value("None"));
     mock.answers.erase("GetAll");
     EXPECT_TRUE(passes([this] { return at(latest(contextCode), {"0", "State"}) == Value("Connected"); }));
-    EXPECT_EQ(at(latest(simCode), {"kSimFile_ICCID"}), Value("89011010000000000017"));
+    // The answers come in any order.
+    EXPECT_TRUE(
+        passes([this] { return at(latest(simCode), {"kSimFile_ICCID"}) == Value("89011010000000000017"); }));
 }
 
 } // namespace
