@@ -67,16 +67,17 @@ int serve(const Options& options, const velmora::SourceChoice& choice) {
         std::fprintf(stderr, "%s: %s\n", program, source.reason().c_str());
         return badInput;
     }
+    // Before there are sockets that a signal would leave behind.
+    const SignalWatcher signals([&loop](int number) {
+        logFormat(LogPriority::Notice, "stopping on signal %d", number);
+        loop.quit(done);
+    });
     LogServer server(ports, queue, **source);
     const auto listening = server.listen([&loop] { loop.quit(badInput); });
     if (!listening) {
         std::fprintf(stderr, "%s: %s\n", program, listening.reason().c_str());
         return badInput;
     }
-    const SignalWatcher signals([&loop](int number) {
-        logFormat(LogPriority::Notice, "stopping on signal %d", number);
-        loop.quit(done);
-    });
     const std::string serving = std::string("serving ").append(options.source);
     logLine(LogPriority::Notice, serving);
     manager.ready(serving);

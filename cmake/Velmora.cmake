@@ -42,6 +42,14 @@ function(velmora_compile_quickly name)
     target_compile_options(${name} PRIVATE "$<$<CONFIG:Release,RelWithDebInfo>:-O1;-g1>")
 endfunction()
 
+# velmora_uses_regex(FILE...): the compiler takes fright at the standard library's regular expressions when it adds
+# the sanitizers' code; in these sources of the folder it does not say so.
+function(velmora_uses_regex)
+    if(VELMORA_SANITIZE AND CMAKE_CXX_COMPILER_ID STREQUAL GNU)
+        set_source_files_properties(${ARGN} PROPERTIES COMPILE_OPTIONS -Wno-maybe-uninitialized)
+    endif()
+endfunction()
+
 # velmora_test(NAME SOURCES file... [LINK target...] [NEEDS program...]): a GoogleTest executable whose cases
 # CTest runs one by one. NEEDS builds programs that the cases start, so that one target builds all a test needs.
 function(velmora_test name)

@@ -55,6 +55,9 @@ TEST_F(ServiceProcessTest, WatcherOutlivesAServiceThatIsKilled) {
     place = watcher.waitFor("\n\nConnecting...\n", *place);
     ASSERT_TRUE(place);
     service = startService("scenario:gsm,seed=1,speed=20");
+    // The rows that it had may be shown once more before it is connected.
+    place = watcher.waitFor("\nUpdated ", *place);
+    ASSERT_TRUE(place);
     ASSERT_TRUE(watcher.waitFor("RR State", *place));
 
     watcher.signal(SIGINT);
