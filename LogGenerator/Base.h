@@ -105,8 +105,8 @@ protected:
     void showList(const ListField& field, const CountedList& list, std::uint32_t logCode) const;
 
     /// A new array of one dictionary per entry, made by `layout`, whose minimum length is the entries' and
-    /// their stride. Where the count promises more entries than
-    /// the record holds, those that lie wholly inside are shown and one error line says so.
+    /// their stride. Where the count promises more entries than the record holds, those that lie wholly
+    /// inside are shown and one error line says so.
     [[nodiscard]] static Array rows(const CountedList& list, const Layout& layout, std::uint32_t logCode);
     /// That error line, where it is due.
     static void reportMissingEntries(const CountedList& list, std::uint32_t logCode);
