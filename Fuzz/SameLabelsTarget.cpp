@@ -19,6 +19,7 @@ struct Remembered {
 };
 constexpr Remembered remembered[] = {
     {"Ostrel_GSM", 0x51FF},  // the BSICs of the channels that 0x5137 lists
+    {"C2KTemplate", 0x119D}, // the running average of frame errors
     {"C2KTemplate", 0x1192}, // the counters that a data rate is counted from, forward
     {"C2KTemplate", 0x127E}, // and reverse
 };
