@@ -209,7 +209,7 @@ DictionaryRef OstrelLogGenerator2::getStartCommand() const {
         else
             logCodes->append(code);
     }
-    const DictionaryRef command = makeDictionary();
+    DictionaryRef command = makeDictionary();
     command->set("SetState", "Streaming");
     command->set("SetOstrelLogCodes", logCodes);
     command->set("SetVoxExtraCodes", extraCodes);

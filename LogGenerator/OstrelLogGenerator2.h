@@ -51,7 +51,7 @@ private:
     /// Every message is kept for the log, routed or not, with its prefix.
     void keep(const Data& message);
     /// Gives the sections of this decoder their nodes of a display that an earlier decoder built.
-    void adoptDisplay(const Value& display);
+    void adoptDisplay(const Value& object);
 
     std::string pListName;
     std::shared_ptr<ClassIndex> cIndex;

@@ -3,7 +3,7 @@
 namespace velmora {
 
 DictionaryRef makeSnapshot(Time timeStamp, const ArrayRef& saveContents, std::string_view description) {
-    const DictionaryRef snapshot = makeDictionary();
+    DictionaryRef snapshot = makeDictionary();
     snapshot->set("Timestamp", dateDescription(timeStamp));
     if (!saveContents)
         return snapshot; // the pairs end at the first whose value is missing

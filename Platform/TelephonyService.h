@@ -29,12 +29,12 @@ public:
     /// Connects to the service; null when it is not there. `callback` runs on the main queue when the service
     /// has something to say on this connection, for as long as the connection is held.
     [[nodiscard]] virtual std::shared_ptr<VoxServerConnection>
-    _VoxServerConnectionCreate(std::function<void()> callback) = 0; // NOLINT(bugprone-reserved-identifier)
+    _VoxServerConnectionCreate(std::function<void()> callback) = 0; // NOLINT: the service's own name
 
     /// Asks for a log channel that sends to the local port `localPortName`; `remotePortName` becomes the name
     /// of the port that takes the channel's commands. It may come back empty, as an error of the service's.
     [[nodiscard]] virtual VoxError
-    _VoxServerConnectionNetworkMonitorCreateLogChannel( // NOLINT(bugprone-reserved-identifier)
+    _VoxServerConnectionNetworkMonitorCreateLogChannel( // NOLINT: the service's own name
         VoxServerConnection& connection, const std::string& localPortName, std::string& remotePortName) = 0;
 };
 

@@ -103,10 +103,9 @@ std::string BlockReader::describe(Fault fault, const Block& block) const {
     switch (fault) {
     case Fault::None: break;
     case Fault::CutOff:
-        return block.length == 0 ? "block header cut off after " + std::to_string(_input.available().size()) +
-                                       " of " + std::to_string(pcapng::blockOverhead) + " bytes"
-                                 : "block cut off after " + std::to_string(_input.available().size()) +
-                                       " of " + std::to_string(block.length) + " bytes";
+        return std::string(block.length == 0 ? "block header" : "block") + " cut off after " +
+               std::to_string(_input.available().size()) + " of " +
+               std::to_string(block.length == 0 ? pcapng::blockOverhead : block.length) + " bytes";
     case Fault::NoByteOrder: return "section header without a byte-order magic";
     case Fault::Length:
         return "block length " + std::to_string(block.length) + ", wanted a multiple of 4 from " +

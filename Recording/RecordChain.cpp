@@ -45,7 +45,7 @@ bool isStream(std::uint8_t type) {
 
 /// `nearby`: the time stamp of a record close to it.
 int evidenceOfTimestamp(std::uint64_t timestamp, std::optional<std::uint64_t> nearby) {
-    constexpr std::uint64_t day = 86'400 * 800; // in units of 1.25 ms
+    constexpr std::uint64_t day = std::uint64_t{86'400} * 800; // in units of 1.25 ms
     if (timestamp == 0)
         return nearby.value_or(0) == 0 ? Evidence::zeroAmongZeros : Evidence::zeroAmongTimes;
     if (!timeOfRecord(timestamp))

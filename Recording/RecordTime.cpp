@@ -51,12 +51,13 @@ std::optional<Time> timeOfRecord(std::uint64_t timestamp) {
     const Time systemTime = epoch + units * unit + rest;
     // The last leap whose new second has come; within the inserted second itself UTC stands at that leap.
     seconds ahead(std::ssize(leaps));
-    for (; ahead > 0s; --ahead) {
+    for (; ahead.count() > 0; --ahead) {
         const Time leap = leaps[ahead.count() - 1];
         if (systemTime >= leap + ahead)
             break;
-        if (systemTime >= leap + ahead - 1s)
-            return leap + (systemTime - (leap + ahead - 1s));
+        const Time inserted = leap + ahead - seconds(1);
+        if (systemTime >= inserted)
+            return leap + (systemTime - inserted);
     }
     return systemTime - ahead;
 }

@@ -10,6 +10,8 @@ test_packages=(libgtest-dev libgmock-dev libbenchmark-dev python3 tshark clang-f
     modemmanager shellcheck lintian fakeroot file systemd python3-jsonschema mandoc bash-completion)
 # shellcheck disable=SC2034
 fuzz_packages=(clang libclang-rt-14-dev)
+# shellcheck disable=SC2034
+lint_packages=(clang-tidy cppcheck)
 
 say() { printf '%s\n' "$*" >&2; }
 

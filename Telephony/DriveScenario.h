@@ -37,12 +37,12 @@ protected:
     /// long, or longer while the script is not at its end.
     struct Phase {
         double duration_s;
-        void (DriveScenario::*begin)();
+        void (DriveScenario::*begin)() = nullptr;
 
         template <class Kind>
         constexpr Phase(double duration, void (Kind::*procedure)())
             : duration_s(duration), begin(static_cast<void (DriveScenario::*)()>(procedure)) {}
-        constexpr Phase(double duration, std::nullptr_t) : duration_s(duration), begin(nullptr) {}
+        constexpr Phase(double duration, std::nullptr_t) : duration_s(duration) {}
     };
 
     /// The phases must outlive the scenario and be those of its own kind.

@@ -28,7 +28,8 @@ public:
     /// `changed` is called whenever the technology has become another one, started or not; an empty function
     /// takes it back. What is sent from then on is of the new technology. A source that speaks one technology
     /// for all its life need not override it.
-    virtual void whenTechnologyChanges(std::function<void()> changed) { static_cast<void>(changed); }
+    // NOLINTNEXTLINE(performance-unnecessary-value-param) those that override it keep the function
+    virtual void whenTechnologyChanges(std::function<void()> /*changed*/) {}
     /// Begins to send from the very beginning, never from inside this call. Precondition: not started. The
     /// sink must live until `stop`.
     virtual void start(LogSink& sink) = 0;

@@ -83,7 +83,7 @@ void MessagePlayer::wake(const std::shared_ptr<Run>& run) {
         }
         const Data message = std::move(run->event->message);
         // Sending may stop the run.
-        const double offset_ns = static_cast<double>(run->event->offset.count());
+        const auto offset_ns = static_cast<double>(run->event->offset.count());
         run->event.reset();
         run->sink.take(message);
         if (run->stopped)

@@ -15,7 +15,8 @@ constexpr std::chrono::nanoseconds loopPause = std::chrono::seconds(1);
 } // namespace
 
 Result<std::unique_ptr<ReplaySource>> ReplaySource::create(MainQueue& queue, const Clock& clock,
-                                                           std::string name, Open open, Options options) {
+                                                           std::string name, Open open,
+                                                           const Options& options) {
     auto reader = open();
     if (!reader)
         return Failure{name + ": " + reader.reason()};
@@ -34,7 +35,7 @@ Result<std::unique_ptr<ReplaySource>> ReplaySource::create(MainQueue& queue, con
 }
 
 ReplaySource::ReplaySource(MainQueue& queue, const Clock& clock, std::string name, std::string technology,
-                           Open open, Options options)
+                           Open open, const Options& options)
     : _name(std::move(name)), _technology(std::move(technology)), _open(std::move(open)), _loop(options.loop),
       _player(queue, clock, options.speed) {}
 

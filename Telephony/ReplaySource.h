@@ -31,7 +31,7 @@ public:
     /// that cannot be read or, unless the options name it, does not tell which technology it is of. Queue and
     /// clock must outlive it.
     static Result<std::unique_ptr<ReplaySource>> create(MainQueue& queue, const Clock& clock,
-                                                        std::string name, Open open, Options options);
+                                                        std::string name, Open open, const Options& options);
 
     [[nodiscard]] std::string_view technology() const override { return _technology; }
     void start(LogSink& sink) override;
@@ -39,7 +39,7 @@ public:
 
 private:
     ReplaySource(MainQueue& queue, const Clock& clock, std::string name, std::string technology, Open open,
-                 Options options);
+                 const Options& options);
 
     bool rewind();
     [[nodiscard]] std::optional<ScenarioEvent> next();

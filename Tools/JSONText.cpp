@@ -22,7 +22,7 @@ constexpr bool isPlain(unsigned char byte) {
     return byte >= 0x20 && byte < 0x80 && byte != '"' && byte != '\\';
 }
 
-constexpr std::array<bool, 256> plainBytes = [] {
+constexpr std::array<bool, 256> plainBytes = []() {
     std::array<bool, 256> plain{};
     for (std::size_t byte = 0; byte < plain.size(); ++byte)
         plain[byte] = isPlain(static_cast<unsigned char>(byte));

@@ -64,7 +64,7 @@ DictionaryRef C2KLogGenerator::getStartCommand() const {
     const ArrayRef logCodes = makeArray();
     for (const C2K::LogCodeParser* parser : C2K::logCodeParsers())
         logCodes->append(parser->logCode());
-    const DictionaryRef command = makeDictionary();
+    DictionaryRef command = makeDictionary();
     command->set("SetState", "Streaming");
     command->set("SetOstrelLogCodes", logCodes);
     return command;

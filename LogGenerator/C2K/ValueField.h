@@ -17,7 +17,7 @@ namespace velmora::C2K {
 struct Shown {
     enum class Kind : std::uint8_t { Plain, Texts, Hexadecimal };
 
-    consteval Shown(Show plain) : show(plain) {}
+    consteval Shown(const Show& plain) : show(plain) {}
     consteval Shown(const NumberedTexts& table) : kind(Kind::Texts), texts(&table) {}
 
     Kind kind = Kind::Plain;

@@ -67,13 +67,13 @@ Value GSMLogGenerator::generateLogUsingState(Dictionary& state) {
 }
 
 DictionaryRef GSMLogGenerator::getStartCommand() const {
-    const DictionaryRef command = makeDictionary();
+    DictionaryRef command = makeDictionary();
     command->set("SetState", "Streaming");
     return command;
 }
 
 ArrayRef GSMLogGenerator::getSaveContentsFromState(const Dictionary& state) const {
-    const ArrayRef contents = makeArray();
+    ArrayRef contents = makeArray();
     if (const Array* history = state["History"].asArray())
         for (const Value& entry : *history)
             contents->append(entry);

@@ -4,11 +4,10 @@
 
 #include <cstdint>
 
-namespace velmora::UTRAN {
-
 /// 0xD00C, the transport channels' quality, as "TRCH BLER" and "CCTRCH SIR" read it. Both counts lie in the
 /// 16 bits at 14: the transport channels' in bits 6 to 11, the coded composite ones' in the four above.
-namespace quality {
+namespace velmora::UTRAN::quality {
+
 inline constexpr std::uint32_t code = 0xD00C;
 inline constexpr std::size_t minimumLength = 17;
 
@@ -25,6 +24,5 @@ constexpr std::size_t firstCompositeChannel(std::size_t transportChannelCount) {
     return 289 + 34 * transportChannelCount;
 }
 inline constexpr std::size_t compositeChannelLength = 8;
-} // namespace quality
 
-} // namespace velmora::UTRAN
+} // namespace velmora::UTRAN::quality

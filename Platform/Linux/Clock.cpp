@@ -89,9 +89,8 @@ std::optional<Time> timeOfDateDescription(std::string_view text) {
     const std::chrono::seconds seconds(number(17, 2));
     const std::chrono::hours zoneHours(number(21, 2));
     const std::chrono::minutes zoneMinutes(number(23, 2));
-    using namespace std::chrono_literals;
-    if (year < 1678 || year > 2261 || !date.ok() || hours >= 24h || minutes >= 60min || seconds >= 60s ||
-        zoneHours >= 24h || zoneMinutes >= 60min)
+    if (year < 1678 || year > 2261 || !date.ok() || hours.count() >= 24 || minutes.count() >= 60 ||
+        seconds.count() >= 60 || zoneHours.count() >= 24 || zoneMinutes.count() >= 60)
         return std::nullopt;
     const std::chrono::seconds zone = zoneHours + zoneMinutes;
     return std::chrono::sys_days(date) + hours + minutes + seconds - (text[20] == '-' ? -zone : zone);

@@ -64,7 +64,7 @@ Result<Done> replaceFile(const std::filesystem::path& path, Bytes content) {
     Result<FileDraft> draft = FileDraft::create(path, S_IRUSR | S_IWUSR);
     if (!draft)
         return Failure{draft.reason()};
-    if (const auto written = writeAll(draft->descriptor(), content); !written)
+    if (auto written = writeAll(draft->descriptor(), content); !written)
         return written;
     return draft->publish(FileDraft::WhereThereIsOne::Replace);
 }

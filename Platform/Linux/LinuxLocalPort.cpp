@@ -61,13 +61,13 @@ Result<std::shared_ptr<LinuxLocalPort>> LinuxLocalPort::create(const std::string
         name, std::move(callback), options, *std::move(directory), **std::move(lock), *std::move(socket)));
 }
 
-LinuxLocalPort::LinuxLocalPort(std::string name, MessagePorts::MessageCallback callback,
-                               const PortOptions& options, PortDirectory directory, PortNameLock lock,
-                               FileDescriptor socket)
+LinuxLocalPort::LinuxLocalPort(std::string name, MessagePorts::MessageCallback callback, PortOptions options,
+                               PortDirectory directory, PortNameLock lock, FileDescriptor socket)
     : _name(std::move(name)),
       _callback(std::make_shared<const MessagePorts::MessageCallback>(std::move(callback))),
-      _options(options), _directory(std::move(directory)), _lock(std::move(lock)), _socket(std::move(socket)),
-      _acceptPause([this] { _acceptWatch->setEnabled(true); }), _serve([this] { serveQueued(); }) {}
+      _options(std::move(options)), _directory(std::move(directory)), _lock(std::move(lock)),
+      _socket(std::move(socket)), _acceptPause([this] { _acceptWatch->setEnabled(true); }),
+      _serve([this] { serveQueued(); }) {}
 
 LinuxLocalPort::~LinuxLocalPort() {
     close();

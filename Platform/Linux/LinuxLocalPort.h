@@ -45,7 +45,7 @@ private:
     };
     enum class Served { Idle, More, Closed, PortGone };
 
-    LinuxLocalPort(std::string name, MessagePorts::MessageCallback callback, const PortOptions& options,
+    LinuxLocalPort(std::string name, MessagePorts::MessageCallback callback, PortOptions options,
                    PortDirectory directory, PortNameLock lock, FileDescriptor socket);
 
     void acceptConnections();

@@ -18,15 +18,15 @@ class LinuxTelephonyService final : public TelephonyService {
 public:
     explicit LinuxTelephonyService(MessagePorts& ports) : _ports(ports) {}
 
-    [[nodiscard]] std::shared_ptr<VoxServerConnection> _VoxServerConnectionCreate(
-        std::function<void()> callback) override; // NOLINT(bugprone-reserved-identifier)
+    [[nodiscard]] std::shared_ptr<VoxServerConnection>
+    _VoxServerConnectionCreate(std::function<void()> callback) override;
 
     /// An answer that is no property list, or has no port name, is success with an empty name. Precondition:
     /// `connection` comes from this class.
     [[nodiscard]] VoxError
-    _VoxServerConnectionNetworkMonitorCreateLogChannel( // NOLINT(bugprone-reserved-identifier)
-        VoxServerConnection& connection, const std::string& localPortName,
-        std::string& remotePortName) override;
+    _VoxServerConnectionNetworkMonitorCreateLogChannel(VoxServerConnection& connection,
+                                                       const std::string& localPortName,
+                                                       std::string& remotePortName) override;
 
 private:
     MessagePorts& _ports;

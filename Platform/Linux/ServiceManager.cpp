@@ -50,14 +50,14 @@ void ServiceManager::ready(std::string_view status) const {
     // A line break would begin another assignment.
     std::transform(status.begin(), status.end(), std::back_inserter(message),
                    [](char c) { return c == '\n' ? ' ' : c; });
-    send(std::move(message));
+    send(message);
 }
 
 void ServiceManager::stopping() const {
     send("STOPPING=1");
 }
 
-void ServiceManager::send(std::string message) const {
+void ServiceManager::send(std::string_view message) const {
     if (_address.empty())
         return;
     sockaddr_un address = {};

@@ -21,7 +21,7 @@ public:
     void stopping() const;
 
 private:
-    void send(std::string message) const;
+    void send(std::string_view message) const;
 
     std::string _address;
 };

@@ -9,9 +9,9 @@
 #include <QString>
 #include <QStringList>
 
-#include <signal.h>
 #include <sys/types.h>
 
+#include <csignal>
 #include <filesystem>
 #include <string>
 #include <system_error>

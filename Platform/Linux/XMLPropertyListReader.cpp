@@ -19,7 +19,7 @@ namespace {
 /// for comments' and sections' pieces, whatever a caller's limit is.
 std::size_t documentBytes(std::size_t objects) {
     constexpr std::size_t bytesAnObject = 256;
-    constexpr std::size_t anyDocument = 256 * 1024;
+    constexpr std::size_t anyDocument = std::size_t{256} * 1024;
     constexpr std::size_t most = std::numeric_limits<std::size_t>::max() - anyDocument;
     return (objects > most / bytesAnObject ? most : objects * bytesAnObject) + anyDocument;
 }
@@ -144,13 +144,13 @@ bool Reader::expectNoText(pugi::xml_node element) {
 
 bool Reader::readDocument(Value& value) {
     pugi::xml_node root;
-    if (!nextElement(_document, root))
+    if (!nextElement(_document.root(), root))
         return false;
     if (!root)
         return fail("the list has no element");
     const bool good =
         std::string_view(root.name()) == "plist" ? readPlist(root, value) : readValue(root, 1, value);
-    if (!good || !nextElement(_document, root))
+    if (!good || !nextElement(_document.root(), root))
         return false;
     return !root || failAt(root, "a second root element <" + std::string(root.name()) + ">");
 }

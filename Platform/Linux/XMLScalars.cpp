@@ -16,7 +16,7 @@ namespace {
 constexpr std::string_view base64Digits = "ABCDEFGHIJKLMNOPQRSTUVWXYZabcdefghijklmnopqrstuvwxyz0123456789+/";
 constexpr std::uint8_t notBase64 = 0xFF;
 
-constexpr std::array<std::uint8_t, 256> base64Values = [] {
+constexpr std::array<std::uint8_t, 256> base64Values = []() {
     std::array<std::uint8_t, 256> values{};
     for (auto& value : values)
         value = notBase64;

@@ -149,7 +149,7 @@ DictionaryRef placeOf(const Value& location, const Modem& modem) {
 }
 
 DictionaryRef simFilesOf(const Modem& modem, const Dictionary& sim) {
-    const DictionaryRef files = makeDictionary();
+    DictionaryRef files = makeDictionary();
     feed(*files, Feeds::SIMFile, MemberOf::SIM, sim);
     feed(*files, Feeds::SIMFile, MemberOf::Modem, modem[mm::modem]);
     return files;

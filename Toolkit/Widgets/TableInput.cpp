@@ -139,7 +139,7 @@ bool TableInput::moveFocus(int key) {
     const auto total = static_cast<long long>(_table.rows().total());
     const auto page = static_cast<long long>(_table.rowsPerPage());
     const auto now = static_cast<long long>(_table.focusRow().value_or(0));
-    long long next = now;
+    long long next = 0;
     switch (key) {
     case Qt::Key_Up: next = now - 1; break;
     case Qt::Key_Down: next = _table.focusRow() ? now + 1 : 0; break;
