@@ -1,16 +1,8 @@
 #include "Recording/DLFReader.h"
 
-#include "Recording/FileSource.h"
 #include "Recording/InputBegin.h"
 
 namespace velmora {
-
-Result<std::unique_ptr<DLFReader>> DLFReader::open(const std::string& path) {
-    Result<std::unique_ptr<ByteSource>> source = FileSource::open(path);
-    if (!source)
-        return Failure{source.reason()};
-    return open(ChunkedInput(*std::move(source)));
-}
 
 Result<std::unique_ptr<DLFReader>> DLFReader::open(ChunkedInput input, std::string_view wanted) {
     std::unique_ptr<DLFReader> reader(new DLFReader(std::move(input)));

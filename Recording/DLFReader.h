@@ -3,7 +3,7 @@
 #include "Recording/RecordReader.h"
 
 #include <memory>
-#include <string>
+#include <string_view>
 #include <utility>
 
 namespace velmora {
@@ -19,10 +19,8 @@ namespace velmora {
 /// bounded whatever the file holds; who keeps messages for long, copies them. Main thread only.
 class DLFReader final : public RecordReader {
 public:
-    /// Opens a file, "-" being standard input, and looks ahead for its technology. Fails when it cannot be
-    /// read, or does not begin as a DLF log does; the reason does not repeat the path.
-    static Result<std::unique_ptr<DLFReader>> open(const std::string& path);
-    /// As above, for an input of which nothing has been skipped. `wanted`: what the reason says was wanted.
+    /// Opens an input of which nothing has been skipped, and looks ahead for its technology. Fails when it
+    /// cannot be read, or does not begin as a DLF log does. `wanted`: what the reason says was wanted.
     static Result<std::unique_ptr<DLFReader>>
     open(ChunkedInput input, std::string_view wanted = "a DLF log's version report or log records");
 

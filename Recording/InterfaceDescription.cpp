@@ -45,7 +45,7 @@ std::optional<InterfaceDescription> InterfaceDescription::read(Bytes body, bool 
         const std::size_t value = at + optionHeader;
         if (!fields.isGood() || option == pcapng::Option::End)
             break;
-        if (value > body.size() || length > body.size() - value)
+        if (length > body.size() - value) // the option's header lies inside
             return std::nullopt;
         if (option == pcapng::Option::InterfaceName) {
             const Bytes name = body.subspan(value, std::min(length, maximumName));

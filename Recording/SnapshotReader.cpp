@@ -3,7 +3,6 @@
 #include "Platform/PropertyList.h"
 #include "Platform/TelephonyService.h"
 #include "Recording/DataSource.h"
-#include "Recording/FileSource.h"
 
 #include <algorithm>
 #include <chrono>
@@ -53,13 +52,6 @@ Result<Value> readWhole(ChunkedInput& input) {
 }
 
 } // namespace
-
-Result<std::unique_ptr<SnapshotReader>> SnapshotReader::open(const std::string& path) {
-    Result<std::unique_ptr<ByteSource>> source = FileSource::open(path);
-    if (!source)
-        return Failure{source.reason()};
-    return open(ChunkedInput(*std::move(source)));
-}
 
 Result<std::unique_ptr<SnapshotReader>> SnapshotReader::open(ChunkedInput input) {
     const Result<Value> root = readWhole(input);

@@ -31,10 +31,8 @@ namespace velmora {
 /// is held in memory: at most 256 MiB of it are taken. Main thread only.
 class SnapshotReader final : public RecordReader {
 public:
-    /// Opens a file, "-" being standard input, and reads it whole. Fails when it cannot be read, or is no
-    /// snapshot; the reason does not repeat the path.
-    static Result<std::unique_ptr<SnapshotReader>> open(const std::string& path);
-    /// As above, for an input of which nothing has been skipped.
+    /// Opens an input of which nothing has been skipped, and reads it whole. Fails when it cannot be read, or
+    /// is no snapshot.
     static Result<std::unique_ptr<SnapshotReader>> open(ChunkedInput input);
 
     [[nodiscard]] std::string_view form() const override { return "snapshot"; }

@@ -40,11 +40,12 @@
 #include <unistd.h>
 
 extern "C" {
-// The C library's own names for what this library stands before.
-void* __libc_malloc(std::size_t size);                          // NOLINT(bugprone-reserved-identifier)
-void* __libc_calloc(std::size_t count, std::size_t size);       // NOLINT(bugprone-reserved-identifier)
-void* __libc_realloc(void* memory, std::size_t size);           // NOLINT(bugprone-reserved-identifier)
-void* __libc_memalign(std::size_t alignment, std::size_t size); // NOLINT(bugprone-reserved-identifier)
+// NOLINTBEGIN(bugprone-reserved-identifier) the C library's own names for what this library stands before
+void* __libc_malloc(std::size_t size);
+void* __libc_calloc(std::size_t count, std::size_t size);
+void* __libc_realloc(void* memory, std::size_t size);
+void* __libc_memalign(std::size_t alignment, std::size_t size);
+// NOLINTEND(bugprone-reserved-identifier)
 }
 
 namespace {
@@ -171,7 +172,8 @@ mode_t modeOf(int flags, std::va_list arguments) {
 
 extern "C" {
 
-// NOLINTBEGIN(bugprone-reserved-identifier)
+// The C library's names again; those that it gives their parameters say little.
+// NOLINTBEGIN(bugprone-reserved-identifier,readability-inconsistent-declaration-parameter-name)
 
 void velmoraCountCalls(int isCounting) {
     counting = isCounting != 0;
@@ -297,6 +299,6 @@ int mkostemp64(char* pattern, int flags) {
     return mkostemp(pattern, flags);
 }
 
-// NOLINTEND(bugprone-reserved-identifier)
+// NOLINTEND(bugprone-reserved-identifier,readability-inconsistent-declaration-parameter-name)
 
 } // extern "C"

@@ -14,8 +14,6 @@ extern "C" __attribute__((weak)) void velmoraCountCalls(int isCounting);
 namespace velmora {
 namespace {
 
-using namespace std::chrono_literals;
-
 void countCalls(bool isCounting) {
     if (velmoraCountCalls)
         velmoraCountCalls(isCounting ? 1 : 0);
@@ -24,7 +22,7 @@ void countCalls(bool isCounting) {
 /// The application with one display, on fakes but for the files, whose directory outlives it.
 class SavingApplication : public AppFixture {
 public:
-    explicit SavingApplication(const std::filesystem::path& logs) : _logs(logs) {
+    explicit SavingApplication(std::filesystem::path logs) : _logs(std::move(logs)) {
         std::filesystem::remove(directory / "logs");
         std::filesystem::create_directory_symlink(_logs, directory / "logs");
     }
@@ -50,7 +48,7 @@ public:
 private:
     void TestBody() override {}
     [[nodiscard]] bool eventuallyShown(const std::string& title) {
-        const auto limit = std::chrono::steady_clock::now() + 300ms;
+        const auto limit = std::chrono::steady_clock::now() + std::chrono::milliseconds(300);
         while (!isShown(title) && std::chrono::steady_clock::now() < limit)
             settle();
         return isShown(title);

@@ -261,7 +261,7 @@ public:
     void updateState(Dictionary&, const Data&) override {}
     Value generateLogUsingState(Dictionary&) override { return {}; }
     DictionaryRef getStartCommand() const override {
-        const DictionaryRef command = makeDictionary();
+        DictionaryRef command = makeDictionary();
         command->set("SetState", Value("\x01"));
         return command;
     }

@@ -38,7 +38,7 @@ void appendBytes(Array& node, Bytes bytes, const void*) {
         node.append(std::to_string(byte));
 }
 
-void later(Array& node, std::vector<std::uint8_t> bytes) {
+void later(Array& node, const std::vector<std::uint8_t>& bytes) {
     node.writeLater({appendBytes, nullptr}, bytes);
 }
 

@@ -62,7 +62,7 @@ TEST_F(LinuxFileDraftTest, IsRemovedUnlessItIsPublished) {
     EXPECT_THAT(names(), ElementsAre());
     FileDraft draft = create("out", "text");
     const FileDraft moved = std::move(draft);
-    draft.discard();
+    draft.discard(); // NOLINT(bugprone-use-after-move) which is what is tested
     EXPECT_EQ(names().size(), 1U) << "the other one has it";
 }
 

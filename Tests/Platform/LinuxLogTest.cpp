@@ -31,7 +31,7 @@ extern "C" void openlog(const char* identity, int options, int facility) {
 }
 
 extern "C" void closelog() {
-    syslogCalls.push_back("close");
+    syslogCalls.emplace_back("close");
 }
 
 extern "C" void syslog(int priority, const char* format, ...) {
@@ -41,11 +41,11 @@ extern "C" void syslog(int priority, const char* format, ...) {
     va_end(arguments);
 }
 
-// What syslog becomes in a fortified build.
-extern "C" void __syslog_chk(int priority, int, const char* format,
-                             ...); // NOLINT(bugprone-reserved-identifier)
-extern "C" void __syslog_chk(int priority, int, const char* format,
-                             ...) { // NOLINT(bugprone-reserved-identifier)
+// What syslog becomes in a fortified build. The names are the library's.
+// NOLINTNEXTLINE(bugprone-reserved-identifier)
+extern "C" void __syslog_chk(int priority, int, const char* format, ...);
+// NOLINTNEXTLINE(bugprone-reserved-identifier)
+extern "C" void __syslog_chk(int priority, int, const char* format, ...) {
     std::va_list arguments;
     va_start(arguments, format);
     syslogCalls.push_back(std::to_string(priority) + " " + formatted(format, arguments));

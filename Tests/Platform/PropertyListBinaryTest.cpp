@@ -257,6 +257,25 @@ TEST(BinaryReader, CountsRepeatedText) {
               "offset 1036: text and data, repeated ones counted, have more than 16777216 bytes");
 }
 
+TEST(BinaryReader, CountsRepeatedTextOfEveryForm) {
+    Buffer references = {0xA8};
+    for (int i = 0; i < 8; ++i)
+        appendBigEndian(references, 1, 4);
+    Buffer data = {0x4F, 0x10, 100};
+    data.insert(data.end(), 100, 0xFF);
+    Buffer utf16 = {0x6F, 0x10, 50};
+    for (int i = 0; i < 50; ++i)
+        appendBigEndian(utf16, 0x00E9, 2); // two bytes as UTF-8
+    for (const Buffer& object : {data, utf16}) {
+        // 8 for the header, 33 for the array, 103 for the object, 8 for the table, 32 for the trailer; 800 of
+        // content.
+        const Buffer list = listOf({Data(Buffer(references)), Data(Buffer(object))});
+        EXPECT_EQ(reasonOf(list, {.maximumBytes = 184}),
+                  "offset 41: text and data, repeated ones counted, have more than 184 bytes");
+        EXPECT_EQ(reasonOf(list, {.maximumBytes = 800}), "read");
+    }
+}
+
 TEST(BinaryReader, RefusesAMillionNestedArrays) {
     std::vector<Data> arrays;
     for (std::uint64_t i = 0; i < 1'000'000; ++i) {

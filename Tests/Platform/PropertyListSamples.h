@@ -47,8 +47,8 @@ namespace velmora {
     const auto strings = makeArray();
     for (const char* text : {"", " ", "\n", " \t\n ", " led and trailed ", "two\r\nlines\r", "<&>\"']]>",
                              "&amp;", "fourteen chars", "fifteen chars..",
-                             "Zellen\xC3\xBC"
-                             "bersicht",
+                             ("Zellen\xC3\xBC"
+                              "bersicht"),
                              "\xE2\x82\xAC", "\xF0\x9F\x93\xB6 4/5", "\xEF\xBF\xBD", "tab\there"})
         strings->append(text);
     strings->append(std::string(300, 'x'));

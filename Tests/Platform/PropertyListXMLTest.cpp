@@ -4,6 +4,7 @@
 #include <gtest/gtest.h>
 
 #include <cmath>
+#include <limits>
 #include <string>
 
 namespace velmora {
@@ -41,6 +42,7 @@ const Good goodScalars[] = {
     {"WhiteSpaceString", plist("<string> \n\t </string>"), " \n\t "},
     {"EntitiesAndReferences", plist("<string>&lt;&gt;&amp;&quot;&apos;&#65;&#x42;&#x1F4F6;</string>"),
      "<>&\"'AB\xF0\x9F\x93\xB6"},
+    {"ReferencesToWhiteSpace", plist("<string>&#9;&#10;&#13;</string>"), "\t\n\r"},
     {"EntitiesAreReplacedOnce", plist("<string>&amp;lt;</string>"), "&lt;"},
     {"LineEndsAreOne", plist("<string>a\r\nb\rc&#13;\nd</string>"), "a\nb\nc\r\nd"},
     {"Section", plist("<string><![CDATA[<a>&amp;]]></string>"), "<a>&amp;"},
@@ -138,11 +140,15 @@ const Bad badInputs[] = {
     {"TwoRoots", "<true/><false/>", "offset 7: a second root element <false>"},
     {"TextBehindTheRoot", "<true/> x", "offset 7: text \" x\" where an element was wanted"},
     {"TextInThePlist", "<plist>x<true/></plist>", "offset 7: text \"x\" where an element was wanted"},
+    {"SectionInThePlist", "<plist><![CDATA[x]]><true/></plist>",
+     "offset 16: text \"x\" where an element was wanted"},
     {"TextInAnArray", "<array><true/>x</array>", "offset 14: text \"x\" where an element was wanted"},
     {"SectionInAnArray", "<array><true/><![CDATA[x]]></array>",
      "offset 23: text \"x\" where an element was wanted"},
     {"TextBeforeAKey", "<dict>x<key>k</key><true/></dict>",
      "offset 6: text \"x\" where an element was wanted"},
+    {"TextBehindAKey", "<dict><key>k</key>x<true/></dict>",
+     "offset 18: text \"x\" where an element was wanted"},
     {"UnknownElement", "<array><text>x</text></array>", "offset 7: <text> where a value was wanted"},
     {"ElementNamesHaveACase", "<String>x</String>", "offset 0: <String> where a value was wanted"},
     {"KeyAsAValue", "<array><key>x</key></array>", "offset 7: <key> where a value was wanted"},
@@ -175,6 +181,8 @@ const Bad badInputs[] = {
      "offset 0: <date> holds \"2026-02-29T05:00:00Z\", not a date like 2026-11-16T05:00:00Z"},
     {"DateHour24", "<date>2026-02-28T24:00:00Z</date>",
      "offset 0: <date> holds \"2026-02-28T24:00:00Z\", not a date like 2026-11-16T05:00:00Z"},
+    {"DateMinute60", "<date>2026-02-28T23:60:00Z</date>",
+     "offset 0: <date> holds \"2026-02-28T23:60:00Z\", not a date like 2026-11-16T05:00:00Z"},
     {"DateSecond60", "<date>2016-12-31T23:59:60Z</date>",
      "offset 0: <date> holds \"2016-12-31T23:59:60Z\", not a date like 2026-11-16T05:00:00Z"},
     {"DateYearZero", "<date>0000-01-01T00:00:00Z</date>",
@@ -187,6 +195,8 @@ const Bad badInputs[] = {
     {"DataOtherCharacters", "<data>AA-_</data>", "offset 0: <data> holds \"AA-_\", not base64"},
     {"LongTextIsShortened", "<integer>" + std::string(50, 'y') + "</integer>",
      "offset 0: <integer> holds \"" + std::string(40, 'y') + "...\", not an integer"},
+    {"LongTextIsCutBetweenCharacters", "<integer>" + std::string(39, 'y') + "\xE2\x82\xAC</integer>",
+     "offset 0: <integer> holds \"" + std::string(39, 'y') + "...\", not an integer"},
     {"UnknownEntity", "<!DOCTYPE plist [<!ENTITY lol \"x\">]><string>a&lol;</string>",
      "offset 44: the text here has the unknown reference \"&lol;\""},
     {"BareAmpersand", "<string>a & b</string>", "offset 8: the text here has the unknown reference \"&\""},
@@ -196,6 +206,14 @@ const Bad badInputs[] = {
      "offset 8: the text here has the unknown reference \"&#xD800;\""},
     {"ReferenceTooLarge", "<string>&#4294967361;</string>",
      "offset 8: the text here has the unknown reference \"&#4294967361;\""},
+    {"ReferenceToANoncharacter", "<string>&#xFFFE;</string>",
+     "offset 8: the text here has the unknown reference \"&#xFFFE;\""},
+    {"ReferenceToTheOtherNoncharacter", "<string>&#xFFFF;</string>",
+     "offset 8: the text here has the unknown reference \"&#xFFFF;\""},
+    {"ReferenceWithLetters", "<string>&#65x;</string>",
+     "offset 8: the text here has the unknown reference \"&#65x;\""},
+    {"ReferenceBehindASection", "<string><![CDATA[a]]>&b;</string>",
+     "offset 21: the text here has the unknown reference \"&b;\""},
     {"ReferenceEmpty", "<string>&#x;</string>", "offset 8: the text here has the unknown reference \"&#x;\""},
     {"ZeroByte", std::string("<string>a\0b</string>", 20), "offset 9: no character of XML in UTF-8"},
     {"ControlCharacter", "<string>\x01</string>", "offset 8: no character of XML in UTF-8"},
@@ -230,6 +248,7 @@ TEST(XMLReader, HoldsToItsLimits) {
     EXPECT_EQ(reasonWith(nested, {.maximumDepth = 2}), "offset 25: <array> is nested deeper than 2");
     EXPECT_EQ(reasonWith(nested, {.maximumObjects = 4}), "read");
     EXPECT_EQ(reasonWith(nested, {.maximumObjects = 3}), "the list has more than 3 objects");
+    EXPECT_EQ(reasonWith(nested, {.maximumObjects = std::numeric_limits<std::size_t>::max()}), "read");
     EXPECT_EQ(reasonWith("<true/>", {.maximumBytes = 7}), "read");
     EXPECT_EQ(reasonWith("<true/>", {.maximumBytes = 6}), "the list has 7 bytes, more than 6");
     EXPECT_EQ(reasonWith("<string>x</string>", {.maximumDepth = 0}), "read");

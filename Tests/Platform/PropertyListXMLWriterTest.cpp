@@ -57,6 +57,7 @@ TEST(XMLWriter, RefusesWhatTheFormCannotCarry) {
     };
     EXPECT_EQ(reasonOf(Value()), "there is no value to write");
     EXPECT_EQ(reasonOf(arrayOf({Value()})), "there is no value to write");
+    EXPECT_EQ(reasonOf(dictionaryOf({{"k", Value()}})), "there is no value to write");
     EXPECT_EQ(reasonOf("ab\x01"), "a string holds what XML cannot carry at its offset 2");
     EXPECT_EQ(reasonOf("a\xFF"), "a string holds what XML cannot carry at its offset 1");
     EXPECT_EQ(reasonOf("\xEF\xBF\xBF"), "a string holds what XML cannot carry at its offset 0");
@@ -66,6 +67,11 @@ TEST(XMLWriter, RefusesWhatTheFormCannotCarry) {
     EXPECT_EQ(reasonOf(Date(sys_days{year{0} / 12 / 31})), "a date lies outside the years 0001 to 9999");
     EXPECT_EQ(reasonOf(nestedArrays(128)), "written");
     EXPECT_EQ(reasonOf(nestedArrays(129)), "the value is nested deeper than 128");
+    Value dictionaries = dictionaryOf({});
+    for (int depth = 1; depth < 128; ++depth)
+        dictionaries = dictionaryOf({{"k", dictionaries}});
+    EXPECT_EQ(reasonOf(dictionaries), "written");
+    EXPECT_EQ(reasonOf(dictionaryOf({{"k", dictionaries}})), "the value is nested deeper than 128");
 
     const auto cycle = makeArray();
     cycle->append(cycle);

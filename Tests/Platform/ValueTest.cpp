@@ -63,7 +63,7 @@ TEST(Value, CopyingSharesContainersAndCopyDoesNot) {
     const auto dictionary = makeDictionary();
     dictionary->set("inner", inner);
     const Value original = dictionary;
-    const Value shared = original;
+    const Value shared = original; // NOLINT(performance-unnecessary-copy-initialization) what is tested
     const Value copied = original.copy();
 
     inner->append(1);

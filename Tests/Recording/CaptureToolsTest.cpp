@@ -24,7 +24,7 @@ protected:
     [[nodiscard]] std::string record(const char* name, std::string_view technology,
                                      std::int64_t firstNanosecond,
                                      const std::vector<const char*>& messages) const {
-        const std::string path = _directory / name;
+        std::string path = _directory / name;
         auto writer = RecordingWriter::create(path, technology);
         EXPECT_TRUE(writer);
         for (const char* const message : messages) {

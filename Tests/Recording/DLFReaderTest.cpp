@@ -2,6 +2,7 @@
 
 #include "Tests/Recording/LogFile.h"
 
+#include <algorithm>
 #include <memory>
 #include <string>
 #include <vector>
@@ -164,6 +165,27 @@ TEST(DLFReader, stampsThatAreNoTimeStandForTheLastOne) {
     // Without one, the beginning of system time: 1980-01-06.
     EXPECT_THAT(timesOf(joined(zero, bad, good, bad)),
                 ElementsAre("315964800000000000", "315964800000000000", later, later));
+    // A report that was written at no time is as none.
+    const Data report = versionReport();
+    std::vector<std::uint8_t> timeless(report.bytes().begin(), report.bytes().end());
+    std::fill_n(timeless.begin() + 81, 4, std::uint8_t{0});
+    EXPECT_THAT(timesOf(joined(Data(std::move(timeless)), zero, good)),
+                ElementsAre("315964800000000000", later));
+}
+
+TEST(DLFReader, looksAMebibyteAheadForTheTechnology) {
+    const Data nobodys = bareRecord(0x0001, std::string(120'000, '0'), stampAfter(0)); // 60012 bytes
+    const Data some = bareRecord(0x512C, "05000100", stampAfter(1));
+    const auto technologyBehind = [&](std::size_t records) {
+        Data file = versionReport();
+        std::vector<std::uint8_t> bytes(file.bytes().begin(), file.bytes().end());
+        for (std::size_t i = 0; i < records; ++i)
+            bytes.insert(bytes.end(), nobodys.bytes().begin(), nobodys.bytes().end());
+        return readAnyForm(joined(Data(std::move(bytes)), some)).technology;
+    };
+    // 17 of them are 1020221 bytes with their type bytes, 18 are above the 1048576.
+    EXPECT_EQ(technologyBehind(17), "Ostrel_GSM");
+    EXPECT_EQ(technologyBehind(18), "");
 }
 
 /// The report, then records of 16, 16, 15 and 17 bytes at 161, 177, 193, 208: the last keeps its type byte.

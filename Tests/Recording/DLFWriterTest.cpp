@@ -6,6 +6,7 @@
 #include "Tests/Support/FakeResources.h"
 #include "Tests/Support/TemporaryDirectory.h"
 
+#include <cerrno>
 #include <chrono>
 #include <filesystem>
 #include <fstream>
@@ -149,6 +150,50 @@ TEST_F(DLFWriterTest, tellsAFailureFromThenOn) {
     const auto none = DLFWriter::start(std::make_unique<FakeRecordingFile>(_medium), "drive.dlf", _clock);
     ASSERT_FALSE(none);
     EXPECT_EQ(none.reason(), "cannot write drive.dlf: No space left on device");
+}
+
+TEST_F(DLFWriterTest, takesNoMessageBehindAFailure) {
+    _medium.room = 161;
+    const auto writer = make();
+    // What is gathered goes out from 64 KiB on: two records of 40012 bytes.
+    const Data half = record(0x512C, std::string(80'000, '0'));
+    const std::string full = "cannot write drive.dlf: No space left on device";
+    EXPECT_TRUE(writer->append(half.bytes()));
+    EXPECT_EQ(writer->append(half.bytes()).reason(), full);
+    _medium.room = SIZE_MAX;
+    EXPECT_EQ(writer->append(half.bytes()).reason(), full);
+    EXPECT_EQ(writer->messages(), 2u);
+    EXPECT_EQ(writer->refused(), 0u);
+    EXPECT_EQ(_medium.content.size(), 161u);
+}
+
+TEST_F(DLFWriterTest, tellsWhatTheMediumSaysInTheEnd) {
+    struct Case {
+        const char* name;
+        bool isRegular;
+        int syncError;
+        int closeError;
+        const char* reason; ///< empty where all is well
+    };
+    const Case cases[] = {
+        {"lost by the medium", true, EIO, 0, "cannot write drive.dlf: Input/output error"},
+        {"lost while closing", true, 0, EDQUOT, "cannot close drive.dlf: Disk quota exceeded"},
+        {"lost twice", true, ENOSPC, EIO, "cannot write drive.dlf: No space left on device"},
+        {"no medium behind it", true, EINVAL, 0, ""},
+        {"a pipe", false, EIO, 0, ""},
+        {"a pipe that is not closed", false, EIO, EIO, "cannot close drive.dlf: Input/output error"},
+    };
+    for (const Case& each : cases) {
+        _medium = FakeMedium();
+        _medium.isRegular = each.isRegular;
+        _medium.syncError = each.syncError;
+        _medium.closeError = each.closeError;
+        const auto writer = make();
+        const auto closed = writer->close();
+        EXPECT_EQ(closed ? "" : closed.reason(), each.reason) << each.name;
+        EXPECT_EQ(_medium.syncsWaitedFor, each.isRegular ? 1u : 0u) << each.name;
+        EXPECT_TRUE(_medium.closed) << each.name;
+    }
 }
 
 TEST_F(DLFWriterTest, makesFiles) {

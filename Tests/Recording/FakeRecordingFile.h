@@ -26,6 +26,7 @@ struct FakeMedium {
     int syncError = 0;              ///< of the sync that is waited for; told once, as systems do
     std::size_t syncsWaitedFor = 0;
     bool closed = false;
+    int closeError = 0;
 };
 
 class FakeRecordingFile final : public RecordingFile {
@@ -62,7 +63,7 @@ public:
     }
     int close() override {
         _medium.closed = true;
-        return 0;
+        return _medium.closeError;
     }
 
 private:

@@ -41,7 +41,7 @@ std::uint64_t stampAfter(std::uint64_t units) {
 }
 
 DictionaryRef historyEntry(Value rawMaterial, std::string_view date) {
-    const DictionaryRef entry = makeDictionary();
+    DictionaryRef entry = makeDictionary();
     entry->set("DisplayState", std::move(rawMaterial));
     entry->set("Display", makeDictionary());
     entry->set("ExtraInfo", makeDictionary());

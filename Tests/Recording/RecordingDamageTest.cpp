@@ -138,7 +138,7 @@ TEST(RecordingDamage, ofManyZeroBytesIsOneLoss) {
     file.raw(std::vector<std::uint8_t>(3'000'000)).message(9, hex("EE").bytes());
     const ReadOut out = readOut(file.data());
     std::vector<std::string> expected = fourTexts;
-    expected.push_back("5 at 3000236, 9 ns: EE");
+    expected.emplace_back("5 at 3000236, 9 ns: EE");
     EXPECT_EQ(out.messages, expected);
     EXPECT_THAT(out.losses, ElementsAre("at 236, 3000000 bytes, record 5: block length 0" + limits));
 }

@@ -210,6 +210,19 @@ TEST(RecordingReader, passesOverInterfacesOfOtherLinkTypes) {
     EXPECT_EQ(out.passedOver.packets, 2U);
 }
 
+TEST(RecordingReader, losesInterfacesAboveTheirBound) {
+    PcapngFile file;
+    file.head(); // the first interface
+    for (int i = 1; i < 65'536; ++i)
+        file.interface(1); // 20 bytes each
+    file.interface(1).message(5, hex("0A0B").bytes());
+    const ReadOut out = readOut(file.data());
+    EXPECT_THAT(out.losses,
+                ElementsAre("at 1310776, 20 bytes, record 1: more than 65536 interfaces in a section"));
+    EXPECT_THAT(out.messages, ElementsAre("1 at 1310796, 5 ns: 0A0B"));
+    EXPECT_EQ(out.passedOver.interfaces, 65'535u);
+}
+
 TEST(RecordingReader, cutsSimplePacketsAtTheSnapshotLength) {
     PcapngFile file;
     file.section().interface(147, {}, 4);
@@ -247,6 +260,12 @@ TEST(RecordingReader, keepsTheFirstHundredLossesAndCountsAll) {
     EXPECT_EQ((*reader)->losses().back().recordNumber, 100U);
     EXPECT_EQ((*reader)->lossTotals().losses, 250U);
     EXPECT_EQ((*reader)->lossTotals().bytes, 250U * 36U);
+}
+
+TEST(RecordingReader, opensNoFileThatIsNotThere) {
+    const auto none = RecordingReader::open("none.pcapng");
+    ASSERT_FALSE(none);
+    EXPECT_EQ(none.reason(), "cannot open: No such file or directory");
 }
 
 TEST(RecordingReader, tellsAReadErrorApartFromTheEnd) {

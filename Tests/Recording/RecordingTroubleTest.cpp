@@ -285,6 +285,42 @@ TEST_F(RecordingTroubleTest, MediumThatFailsInTheEndIsToldWhereNothingWasKept) {
     EXPECT_EQ(medium.syncsWaitedFor, 1U);
 }
 
+TEST_F(RecordingTroubleTest, FileThatIsNotClosedIsToldUnlessThereWasTroubleBefore) {
+    start();
+    ASSERT_TRUE(append(1));
+    medium.closeError = EIO;
+    EXPECT_EQ(reasonOf(writer->close()), "cannot close the recording: Input/output error");
+    EXPECT_THAT(numbers(), ElementsAre(1));
+
+    medium = FakeMedium();
+    start();
+    ASSERT_TRUE(append(1));
+    medium.room = headSize;
+    medium.closeError = EIO;
+    EXPECT_EQ(reasonOf(writer->close()), full);
+}
+
+TEST_F(RecordingTroubleTest, LongMessageIsKeptBehindTroubleThatMayPassAndNotBehindOther) {
+    // Above 128 KiB what has been gathered goes out ahead of the message.
+    const std::vector<std::uint8_t> large(150'000, 2);
+    start();
+    medium.room = headSize;
+    ASSERT_TRUE(append(1));
+    EXPECT_EQ(reasonOf(writer->append(Time(), large)), full);
+    EXPECT_EQ(writer->messages(), 2U);
+    medium.room = SIZE_MAX;
+    ASSERT_TRUE(writer->close());
+    EXPECT_THAT(numbers(), ElementsAre(1, 2));
+
+    medium = FakeMedium();
+    start();
+    medium.room = headSize;
+    medium.fullError = EBADF;
+    ASSERT_TRUE(append(1));
+    EXPECT_EQ(reasonOf(writer->append(Time(), large)), "cannot write the recording: Bad file descriptor");
+    EXPECT_EQ(writer->messages(), 1U);
+}
+
 TEST_F(RecordingTroubleTest, FileSystemWithoutAMediumIsNoTrouble) {
     start();
     ASSERT_TRUE(append(1));

@@ -241,6 +241,19 @@ TEST(SnapshotReader, refusesOtherPropertyLists) {
               "snapshot whose \"Data\" is of kind string, wanted an array");
 }
 
+TEST(SnapshotReader, losesObjectsAbove16MiB) {
+    const DictionaryRef object = makeDictionary();
+    object->set("State", std::string(16'777'216, 'x'));
+    const DictionaryRef small = makeDictionary();
+    small->set("State", "x");
+    const ReadOut out = readAnyForm(snapshotFile({historyEntry(object, "2026-11-16 05:00:02 +0000"),
+                                                  historyEntry(small, "2026-11-16 05:00:04 +0000")}));
+    // 122 bytes of tags about the text.
+    EXPECT_THAT(out.losses, ElementsAre("at 0, 16777338 bytes, record 1: entry 1: object of 16777338 bytes, "
+                                        "wanted at most 16777216"));
+    EXPECT_EQ(out.messages.size(), 1u);
+}
+
 TEST(SnapshotReader, aReadErrorIsNoSnapshot) {
     const Data file = snapshotFile({historyEntry(idle(), "2026-11-16 05:00:02 +0000")});
     EXPECT_EQ(readAnyForm(file, SIZE_MAX, 300).failure, "cannot read: Input/output error at offset 300");

@@ -54,7 +54,7 @@ Result<Done> make(Scenario& scenario, const Length& length, const std::string& p
         if (event.offset >= length.time)
             break;
         const Time time = DriveScenario::beginning() + event.offset;
-        if (const Result<Done> written = (*writer)->append(time, event.message.bytes()); !written)
+        if (Result<Done> written = (*writer)->append(time, event.message.bytes()); !written)
             return written;
     }
     return (*writer)->close();

@@ -93,7 +93,7 @@ protected:
     /// A capture of such messages.
     [[nodiscard]] std::string capture(const std::vector<Data>& messages,
                                       std::string_view technology = "Ostrel_GSM") const {
-        const std::string path = _directory / "a.pcapng";
+        std::string path = _directory / "a.pcapng";
         writeCapture(path, technology, messages);
         return path;
     }

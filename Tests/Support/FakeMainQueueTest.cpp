@@ -16,7 +16,7 @@ using testing::IsEmpty;
 
 class FakeMainQueueTest : public testing::Test {
 protected:
-    MainQueue::Task note(std::string name) {
+    MainQueue::Task note(const std::string& name) {
         return [this, name] {
             _notes.push_back(name + "@" + std::to_string((_clock.now() - FakeClock::defaultNow()) / 1ms));
         };

@@ -21,8 +21,8 @@ public:
     /// The remote port's name that it then gives.
     std::string remotePortName = "com.velmora.test.channel";
 
-    [[nodiscard]] std::shared_ptr<VoxServerConnection> _VoxServerConnectionCreate(
-        std::function<void()> callback) override { // NOLINT(bugprone-reserved-identifier)
+    [[nodiscard]] std::shared_ptr<VoxServerConnection>
+    _VoxServerConnectionCreate(std::function<void()> callback) override {
         ++_connectionsAsked;
         if (!available)
             return nullptr;
@@ -31,8 +31,8 @@ public:
     }
 
     [[nodiscard]] VoxError
-    _VoxServerConnectionNetworkMonitorCreateLogChannel( // NOLINT(bugprone-reserved-identifier)
-        VoxServerConnection&, const std::string& localPortName, std::string& remotePort) override {
+    _VoxServerConnectionNetworkMonitorCreateLogChannel(VoxServerConnection&, const std::string& localPortName,
+                                                       std::string& remotePort) override {
         _localPortNames.push_back(localPortName);
         remotePort = remotePortName;
         return error;

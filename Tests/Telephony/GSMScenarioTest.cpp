@@ -192,9 +192,9 @@ TEST(GSMScenarioTest, eitherRankedListComesToBeTheLatest) {
     int gsm = 0;
     int umts = 0;
     bool latestIsUMTS = false;
-    std::chrono::nanoseconds tick = 2s;
+    std::chrono::nanoseconds tick = std::chrono::seconds(2);
     for (const ScenarioEvent& event : tenMinutes()) {
-        for (; event.offset >= tick; tick += 2s)
+        for (; event.offset >= tick; tick += std::chrono::seconds(2))
             ++(latestIsUMTS ? umts : gsm);
         const auto header = recordHeader(event.message.bytes());
         if (header && header->type == 1 && header->logCode() == 0x4005)

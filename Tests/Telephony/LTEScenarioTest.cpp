@@ -205,7 +205,7 @@ TEST(LTEScenarioTest, aThirdOfTheTimeOrMoreIsConnected) {
         const auto header = recordHeader(event.message.bytes());
         if (!header || !isGood(*header))
             continue;
-        const long second = event.offset / 1s;
+        const long second = event.offset / std::chrono::seconds(1);
         if (header->logCode() == 0xB179)
             connected.insert(second);
         if (header->logCode() == 0xB17F)

@@ -57,7 +57,7 @@ private:
 
 class ReplaySourceTest : public ::testing::Test {
 protected:
-    ReplaySource& make(ReplaySource::Options options = {}) {
+    ReplaySource& make(const ReplaySource::Options& options = {}) {
         auto made = ReplaySource::create(
             queue, clock, "drive.pcapng",
             [this]() -> Result<std::unique_ptr<MessageReader>> {

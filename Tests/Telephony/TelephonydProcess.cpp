@@ -4,10 +4,10 @@
 #include "Tests/Telephony/TelephonyTesting.h"
 
 #include <fcntl.h>
-#include <signal.h>
 #include <sys/wait.h>
 #include <unistd.h>
 
+#include <csignal>
 #include <fstream>
 #include <sstream>
 #include <stdexcept>

@@ -19,7 +19,6 @@
 namespace velmora {
 namespace {
 
-using namespace std::chrono_literals;
 using ::testing::ElementsAre;
 using ::testing::HasSubstr;
 using ::testing::IsEmpty;
@@ -145,7 +144,8 @@ TEST_F(TelephonydTest, replaysAFileAsFastAsItsClientTakesItAndLosesNothing) {
         payload[1] = static_cast<std::uint8_t>(i >> 8);
         payload[2] = static_cast<std::uint8_t>(i >> 16);
         wanted.push_back(recordOf(0xB0E5, Bytes(payload)));
-        ASSERT_TRUE((*writer)->append(FakeClock::defaultNow() + i * 50ms, wanted.back().bytes()));
+        ASSERT_TRUE((*writer)->append(FakeClock::defaultNow() + i * std::chrono::milliseconds(50),
+                                      wanted.back().bytes()));
     }
     ASSERT_TRUE((*writer)->close());
 

@@ -207,7 +207,7 @@ TEST(UTRANScenarioTest, anIdlePhoneRegistersWhereTheAreaChanges) {
         if (header->code == 0xD0E2 && r.size() >= 26) {
             const bool allCalls = r[25] == 0;
             if (allCalls && state == 0 && area != 0 && r[15] != area) {
-                due = event.offset + 5s;
+                due = event.offset + std::chrono::seconds(5);
                 ++changes;
             }
             area = r[15];

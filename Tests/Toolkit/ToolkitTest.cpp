@@ -42,7 +42,7 @@ ReducedMotion::~ReducedMotion() {
     qunsetenv("VELMORA_REDUCED_MOTION");
 }
 
-ListPane::ListPane(std::vector<std::string> rowTexts, std::string title) : texts(std::move(rowTexts)) {
+ListPane::ListPane(std::vector<std::string> rowTexts, std::string_view title) : texts(std::move(rowTexts)) {
     setTitle(title);
 }
 

@@ -15,6 +15,7 @@
 #include <functional>
 #include <memory>
 #include <string>
+#include <string_view>
 #include <vector>
 
 namespace velmora {
@@ -44,7 +45,7 @@ public:
 /// A pane whose rows are the given texts, all under one identifier; keeps what it was asked and told.
 class ListPane : public TableViewController {
 public:
-    explicit ListPane(std::vector<std::string> rowTexts, std::string title = {});
+    explicit ListPane(std::vector<std::string> rowTexts, std::string_view title = {});
 
     [[nodiscard]] std::size_t numberOfRowsInSection(TableView& tableView, std::size_t section) override;
     [[nodiscard]] std::shared_ptr<TableCell> cellForRowAtIndexPath(TableView& tableView,

@@ -259,7 +259,7 @@ TEST_F(ConvertCommandTest, FailureToWriteLeavesWhatWasThere) {
     for (const std::string form : {".pcapng", ".velmora", ".dlf"}) {
         const std::string out = path("out/drive" + form);
         ToolProcess process(tool({"-c", "ulimit -f 0; exec \"$0\" convert --force \"$1\" \"$2\"",
-                                  VELMORA_BUILD_DIR "/velmora-log", path("drive.pcapng"), out}),
+                                  (VELMORA_BUILD_DIR "/velmora-log"), path("drive.pcapng"), out}),
                             "/bin/sh");
         EXPECT_EQ(process.exitStatus(), 1);
         EXPECT_EQ(ownWords(process.errors()),

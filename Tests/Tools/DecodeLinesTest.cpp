@@ -236,7 +236,7 @@ TEST_F(DecodeLinesTest, JobsPrintWhatOneAfterTheOtherPrints) {
         ToolProcess serial(tool(arguments));
         EXPECT_EQ(serial.exitStatus(), 1);
         for (const char* jobs : {"2", "5", "100"}) {
-            arguments.push_back("--jobs");
+            arguments.emplace_back("--jobs");
             arguments.emplace_back(jobs);
             ToolProcess side(tool(arguments));
             arguments.resize(arguments.size() - 2);

@@ -25,7 +25,7 @@ public:
     /// The refreshes that the file tells of, by the number of the message before.
     std::map<std::uint64_t, Time> refreshes;
 
-    ListReader(std::string technology, std::vector<TimedMessage> messages)
+    ListReader(std::string technology, const std::vector<TimedMessage>& messages)
         : _technology(std::move(technology)), _messages(messages.begin(), messages.end()) {}
 
     [[nodiscard]] std::optional<LoggedMessage> next() override {

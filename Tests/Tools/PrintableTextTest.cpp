@@ -19,6 +19,7 @@ TEST(PrintableTextTest, ControlCharactersAreShownAndDoNothing) {
         {"\xC2\x9B"
          "2J",
          "\\u{9B}2J"}, // the one-character form of ESC [
+        // NOLINTNEXTLINE(misc-misleading-bidirectional) which is the case
         {"a\xE2\x80\xAE"
          "b",
          "a\\u{202E}b"}, // turns the writing direction

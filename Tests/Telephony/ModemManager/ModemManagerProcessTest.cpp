@@ -104,7 +104,7 @@ TEST_F(ModemManagerProcessTest, aChangedTechnologyEndsTheChannelAndTheNextOneIsO
     const auto sent = timeOfRecord(*header->timestamp);
     ASSERT_TRUE(sent);
     const auto age = std::chrono::system_clock::now() - *sent;
-    EXPECT_TRUE(age > -1s && age < 1min) << "stamped when it was sent";
+    EXPECT_TRUE(age > -std::chrono::seconds(1) && age < 1min) << "stamped when it was sent";
 
     mock.change(Mock::modemPath(0), Mock::modem, {{"AccessTechnologies", umtsAccess}});
     ASSERT_TRUE(eventually([&] { return !client.commands->isValid(); }));
