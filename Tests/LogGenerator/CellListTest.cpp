@@ -5,6 +5,7 @@
 #include "LogGenerator/ExtraPayload.h"
 #include "Platform/PropertyList.h"
 #include "Platform/TelephonyService.h"
+#include "Tests/LogGenerator/CellTexts.h"
 #include "Tests/Support/CapturedLog.h"
 #include "Tests/Support/Hex.h"
 
@@ -26,7 +27,7 @@ Bytes bytesOf(const std::string& text) {
 
 DictionaryRef cell(std::string_view technology, std::string_view type,
                    std::initializer_list<Dictionary::Entry> more) {
-    const auto fields = std::make_shared<Dictionary>(
+    auto fields = std::make_shared<Dictionary>(
         Dictionary{{std::string(kVoxCellMonitorCellRadioAccessTechnology), technology},
                    {std::string(kVoxCellMonitorCellType), type}});
     for (const auto& [key, value] : more)
@@ -76,18 +77,7 @@ std::string slowly(const Data& record) {
 
 std::string quickly(CellList& list, const Data& record) {
     const std::vector<Cell>* cells = list.read(record);
-    if (!cells)
-        return "none";
-    std::string text;
-    for (const Cell& each : *cells) {
-        text += "[" + std::to_string(each.kind.technology) + " " + std::to_string(each.kind.type);
-        for (std::size_t i = 0; i < cellNumberCount; ++i)
-            if ((each.present >> i & 1) != 0)
-                text +=
-                    " " + std::string(cellNumberKeys[i].substr(15)) + "=" + std::to_string(each.numbers[i]);
-        text += "]";
-    }
-    return text;
+    return cells ? textOf(*cells) : "none";
 }
 
 constexpr const char* shownCells = "[0 0 MCC=1 ARFCN=62 RSSI=-41][1 1 SCN=300][4 2 MNC=-2147483648]";
@@ -161,6 +151,9 @@ TEST(CellListTest, OtherFormsOfTheXMLSayTheSame) {
              "<array><dict>KEY<integer>1</integer></dict></array></plist>",
              "<array><dict>KEY</dict></array>",
              "<array><dict>KEY<integer>1</integer><key>a &amp; b</key><integer>2</integer></dict></array>",
+             "<array><dict><key>kVoxCellMonitorCellRadioAccessTechnology</key><integer>1</integer></dict></"
+             "array>",
+             "<array><dict><key>kVoxCellMonitorCellType</key><integer>1</integer></dict></array>",
              "<array><dict>KEY<integer>1</integer><key>a & b</key><integer>2</integer></dict></array>",
          }) {
         std::string xml = body;
@@ -171,6 +164,16 @@ TEST(CellListTest, OtherFormsOfTheXMLSayTheSame) {
         EXPECT_EQ(quickly(list, record), slowly(record)) << body;
         EXPECT_EQ(quickly(list, record), slowly(record)) << body;
     }
+}
+
+TEST(CellListTest, ListOfMoreThanAMebibyteSaysTheSame) {
+    std::string xml = xmlOf(cellArray());
+    xml.insert(xml.find("<array>") + 7, (std::size_t{1} << 20) + 1, ' ');
+    // The header's length has 16 bits; nothing here looks at it.
+    const Data record = joined(Data(std::vector<std::uint8_t>(13)), Data::copyOf(bytesOf(xml)));
+    CellList list;
+    EXPECT_EQ(quickly(list, record), shownCells);
+    EXPECT_EQ(quickly(list, record), shownCells);
 }
 
 /// A list with one byte changed or its end cut off says the same whichever way it is read, also by a reader

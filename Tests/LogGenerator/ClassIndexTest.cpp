@@ -43,6 +43,22 @@ TEST(ClassIndexTest, FindsSectionsByNameAndCode) {
     EXPECT_THAT(index.getSubscribers(0xFFFFFFFF), IsNull());
 }
 
+class SingleIndex final : public ClassIndex {
+public:
+    SingleIndex() { create(sim); }
+    std::unique_ptr<SimInfo> sim;
+};
+
+TEST(ClassIndexTest, NobodyWantsAnotherCodeHoweverFewThereAre) {
+    const ClassIndex none;
+    EXPECT_THAT(none.getSubscribers(0), IsNull());
+    EXPECT_THAT(none.getSubscribers(0xFF0000), IsNull());
+    const SingleIndex one;
+    EXPECT_THAT(one.getSubscribers(0xFF0000), Pointee(ElementsAre(one.sim.get())));
+    for (std::uint32_t code = 0; code < 16; ++code)
+        EXPECT_THAT(one.getSubscribers(code), IsNull());
+}
+
 TEST(ClassIndexTest, ListsEveryCodeAsADecimalString) {
     EXPECT_THAT(SmallIndex().getAllLogCodes(),
                 UnorderedElementsAre("16711680", "16711682", "28977", "28978"));

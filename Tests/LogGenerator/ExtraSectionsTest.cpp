@@ -110,6 +110,14 @@ TEST_F(SimInfoTest, ReadablePayloadThatIsNoDictionaryHoldsNoFiles) {
     EXPECT_TRUE(node->empty());
 }
 
+TEST_F(SimInfoTest, WithoutANodeItShowsNothingAndStillRaisesWhatItCannotRead) {
+    SimInfo homeless;
+    homeless.updateWithData(extraRecord(0, dictionary({{"kSimFile_ICCID", "8988"}})), 0xFF0000);
+    EXPECT_TRUE(node->empty());
+    EXPECT_THAT(log.lines(), ElementsAre(Line{LogPriority::Warning, "SimInfo"}));
+    EXPECT_THROW(homeless.updateWithData(hex("01"), 0xFF0000), LogCode_0xFF0000::UnknownDataException);
+}
+
 struct Unreadable {
     const char* odd;
     const char* record;

@@ -391,5 +391,14 @@ TEST_F(TemplateTest, NewDecoderGoesOnInTheDisplayOfTheEarlierOne) {
     EXPECT_EQ((*(*display()["Radio"].asDictionary())["RRC Info"].asDictionary())["Length"], Value("13"));
 }
 
+TEST_F(TemplateTest, NewDecoderFindsItsNodesWithinAnArrayToo) {
+    const DictionaryRef node = makeDictionary();
+    state.set("Display", std::make_shared<Dictionary>(
+                             Dictionary{{"Radios", std::make_shared<Array>(Array{std::make_shared<Dictionary>(
+                                                       Dictionary{{"RRC Info", node}})})}}));
+    update(record(0xD0E0, "01 02"));
+    EXPECT_EQ((*node)["Length"], Value("15")); // a header of 13 bytes and 2
+}
+
 } // namespace
 } // namespace velmora

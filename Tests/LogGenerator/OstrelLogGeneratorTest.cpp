@@ -124,6 +124,22 @@ TEST_F(DLFTest, SaveContentsAreACopyOfTheHistoryAndTheLog) {
     EXPECT_EQ(history->size(), 1u);
 }
 
+TEST_F(DLFTest, EntriesThatAreNoDictionariesAreSavedAndGiveTheLogNothing) {
+    history->append("text");
+    addToHistory(Value());
+    const ArrayRef contents = BinaryGenerator(clock).getSaveContentsFromState(state);
+    ASSERT_EQ(contents->size(), 3u);
+    EXPECT_EQ((*contents)[0], Value("text"));
+    EXPECT_EQ((*(*contents)[2].asDictionary())["Description"], Value("DLF binary (161 bytes)"));
+}
+
+TEST_F(DLFTest, SaveContentsWithoutAHistoryAreTheLog) {
+    state.remove("History");
+    const ArrayRef contents = BinaryGenerator(clock).getSaveContentsFromState(state);
+    ASSERT_EQ(contents->size(), 1u);
+    EXPECT_EQ((*(*contents)[0].asDictionary())["Description"], Value("DLF binary (161 bytes)"));
+}
+
 TEST(DLFAddVersionReportTest, ShortBufferGetsNothing) {
     std::array<std::uint8_t, 160> buffer{};
     std::size_t written = 7;

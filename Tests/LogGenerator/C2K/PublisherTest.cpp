@@ -1,6 +1,7 @@
 #include "LogGenerator/C2K/Publisher.h"
 
 #include "Tests/LogGenerator/C2K/ParserHarness.h"
+#include "Tests/Support/NotedEffects.h"
 
 #include <gtest/gtest.h>
 
@@ -59,6 +60,20 @@ TEST_F(PublisherTest, AnOddTargetEndsNoOtherKey) {
     publishTo({"text"});
     C2K::Publisher(&lookup).publish("kB", NumberText("%+.2f dB", 1.0));
     EXPECT_EQ(shown(screen), "{B '+1.00 dB'}");
+}
+
+TEST_F(PublisherTest, EffectsAreToldOfEveryValueShownOrNot) {
+    const std::vector<std::pair<std::string, Value>> told = {
+        {"kA", Value(7)}, {"kA", Value("new")}, {"kB", Value("+1.00 dB")}};
+    lookup.set("kA", std::make_shared<Array>(Array{target("One", screen)}));
+    NotedEffects effects;
+    const C2K::Publisher publisher(&lookup, &effects);
+    publisher.publish("kA", Value(7));
+    EXPECT_EQ((*screen)["One"], Value(7));
+    publisher.publish("kA", "new");
+    publisher.publish("kB", NumberText("%+.2f dB", 1.0));
+    EXPECT_EQ(effects.members, told);
+    EXPECT_EQ(shown(screen), "{One 'new'}");
 }
 
 } // namespace

@@ -63,6 +63,7 @@ TEST(ServingPLMN, ReadsTheNetworkAsBCD) {
     const Case cases[] = {
         {"two digits of MNC end in a blank", identity(0x62, 0xF0, 0x01), "260", "10 "},
         {"three digits of MNC, the third in the middle byte", identity(0x13, 0x40, 0x26), "310", "624"},
+        {"odd digits all through", identity(0x35, 0x17, 0x19), "537", "911"},
         {"fillers in the MCC are blanks", identity(0xFF, 0xF0, 0x01), "  0", "10 "},
         {"ten is the first filler", identity(0xA9, 0x9A, 0xA9), "9  ", "9 9"},
         {"nothing but fillers", identity(0xFF, 0xFF, 0xFF), "   ", "   "},

@@ -26,7 +26,7 @@ struct Part {
     const char* bytes;
 };
 Data quality(std::uint16_t counts, std::size_t length, std::initializer_list<Part> parts = {}) {
-    std::vector<std::uint8_t> payload(length - 13, 0xEE); // what is not read
+    std::vector<std::uint8_t> payload(length - 13, 0xFF); // ones where nothing is read
     payload[14 - 13] = static_cast<std::uint8_t>(counts);
     payload[15 - 13] = static_cast<std::uint8_t>(counts >> 8);
     for (const Part& part : parts) {
