@@ -1,8 +1,11 @@
 #pragma once
 
 #include <algorithm>
+#include <bit>
+#include <concepts>
 #include <cstddef>
 #include <cstdint>
+#include <cstring>
 #include <memory>
 #include <span>
 #include <utility>
@@ -12,6 +15,24 @@ namespace velmora {
 
 /// A view of bytes that somebody else owns.
 using Bytes = std::span<const std::uint8_t>;
+
+/// The number that begins at `bytes`, which must hold all of it. A single load, which compilers do not make
+/// of a loop over bytes everywhere.
+template <std::unsigned_integral Number>
+[[nodiscard]] inline Number numberAt(const std::uint8_t* bytes, std::endian order) {
+    Number number = 0;
+    std::memcpy(&number, bytes, sizeof number);
+    if (order == std::endian::native)
+        return number;
+    if constexpr (sizeof number == 8)
+        return __builtin_bswap64(number);
+    else if constexpr (sizeof number == 4)
+        return __builtin_bswap32(number);
+    else if constexpr (sizeof number == 2)
+        return __builtin_bswap16(number);
+    else
+        return number;
+}
 
 /// A shared, unchanging byte buffer, or a window on one. Copying it, or taking a part of it, copies no byte:
 /// the log message that arrived at the port, the record without its prefix, the state's raw log and the

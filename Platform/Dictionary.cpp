@@ -1,6 +1,7 @@
 #include "Platform/Value.h"
 
 #include <algorithm>
+#include <limits>
 #include <stdexcept>
 #include <utility>
 
@@ -23,22 +24,36 @@ Dictionary::Dictionary(std::initializer_list<Entry> entries) {
         set(entry.key, entry.value);
 }
 
-std::optional<std::size_t> Dictionary::indexOf(std::string_view key) const {
+/// Precondition: no key is to come or go yet.
+std::size_t Dictionary::indexOf(std::string_view key) const {
+    // Neighbouring addresses go to places far from each other (multiplicative hashing by the golden ratio).
+    constexpr std::uint64_t goldenRatio = 0x9E3779B97F4A7C15;
+    const auto address = static_cast<std::uint64_t>(reinterpret_cast<std::uintptr_t>(key.data()));
+    std::uint8_t& hint = _found[address * goldenRatio >> 60];
+    static_assert(sizeof _found == 16);
+    if (hint < _entries.size() && _entries[hint].key == key)
+        return hint;
+    std::size_t index = 0;
     if (!_index.empty()) {
         const auto found = _index.find(key);
         if (found == _index.end())
-            return std::nullopt;
-        return found->second;
+            return nowhere;
+        index = found->second;
+    } else {
+        while (index < _entries.size() && _entries[index].key != key)
+            ++index;
+        if (index == _entries.size())
+            return nowhere;
     }
-    for (std::size_t i = 0; i < _entries.size(); ++i)
-        if (_entries[i].key == key)
-            return i;
-    return std::nullopt;
+    if (index <= std::numeric_limits<std::uint8_t>::max())
+        hint = static_cast<std::uint8_t>(index);
+    return index;
 }
 
 const Value* Dictionary::find(std::string_view key) const {
-    const auto index = indexOf(key);
-    return index ? &written()[*index].value : nullptr;
+    const std::vector<Entry>& entries = written();
+    const std::size_t index = indexOf(key);
+    return index != nowhere ? &entries[index].value : nullptr;
 }
 
 const Value& Dictionary::operator[](std::string_view key) const {
@@ -50,8 +65,8 @@ const Value& Dictionary::operator[](std::string_view key) const {
 Value& Dictionary::slot(std::string_view key) {
     expectMutable();
     static_cast<void>(written());
-    if (const auto index = indexOf(key))
-        return _entries[*index].value;
+    if (const std::size_t index = indexOf(key); index != nowhere)
+        return _entries[index].value;
     _entries.push_back({std::string(key), Value()});
     _keysChanged = ++_changes;
     if (!_index.empty())
@@ -77,16 +92,42 @@ void Dictionary::setText(std::string_view key, std::string_view text) {
 
 bool Dictionary::remove(std::string_view key) {
     expectMutable();
-    const auto index = indexOf(key);
-    if (!index)
-        return false;
     static_cast<void>(written());
-    _entries.erase(_entries.begin() + static_cast<std::ptrdiff_t>(*index));
-    rebuildIndex();
+    const std::size_t index = indexOf(key);
+    if (index == nowhere)
+        return false;
+    erase(index);
     for (Later& later : _later)
         later.hasKeys = false;
-    _keysChanged = _entriesChanged = ++_changes;
     return true;
+}
+
+void Dictionary::erase(std::size_t index) {
+    _entries.erase(_entries.begin() + static_cast<std::ptrdiff_t>(index));
+    rebuildIndex();
+    _keysChanged = _entriesChanged = ++_changes;
+}
+
+void Dictionary::eraseKey(Dictionary& dictionary, Bytes key, const void*) {
+    const std::size_t index = dictionary.indexOf({reinterpret_cast<const char*>(key.data()), key.size()});
+    if (index != nowhere)
+        dictionary.erase(index);
+}
+
+void Dictionary::removeLater(std::string_view key) {
+    expectMutable();
+    const Writing<Dictionary> writing{eraseKey, nullptr};
+    const Bytes bytes(reinterpret_cast<const std::uint8_t*>(key.data()), key.size());
+    auto later = std::find_if(_later.begin(), _later.end(),
+                              [&writing](const Later& known) { return known.writing == writing; });
+    if (later == _later.end()) {
+        later = _later.insert(later, Later{{writing, {}, 0}, true});
+    } else if (!std::equal(bytes.begin(), bytes.end(), later->bytes.begin(), later->bytes.end())) {
+        remove(key);
+        return;
+    }
+    later->ask(writing, bytes, ++_changes);
+    _due = true;
 }
 
 void Dictionary::writeLater(const Writing<Dictionary>& writing, Bytes bytes) {
@@ -112,6 +153,8 @@ void Dictionary::writeNow() const {
     const bool frozen = std::exchange(self._frozen, false);
     const std::uint64_t changes = _changes;
     self._due = false;
+    self._copiedEntries = neverChanged;
+    self._copiedKeys = neverChanged;
     const auto isEarlier = [](const Later& a, const Later& b) { return a.turn - 1 < b.turn - 1; };
     try {
         for (;;) {
@@ -132,7 +175,6 @@ void Dictionary::writeNow() const {
         throw;
     }
     self._frozen = frozen;
-    self._copiedEntries = neverChanged;
     _copies.renumber(changes, _changes);
 }
 

@@ -4,6 +4,7 @@
 #include "Platform/FrozenCopies.h"
 #include "Platform/LaterWriting.h"
 
+#include <array>
 #include <chrono>
 #include <concepts>
 #include <cstdint>
@@ -153,14 +154,14 @@ public:
     /// Sets each entry in turn, so that a key given twice keeps its first place and its last value.
     Dictionary(std::initializer_list<Entry> entries);
 
-    [[nodiscard]] std::size_t size() const { return _entries.size(); }
-    [[nodiscard]] bool empty() const { return _entries.empty(); }
+    [[nodiscard]] std::size_t size() const { return written().size(); }
+    [[nodiscard]] bool empty() const { return written().empty(); }
     [[nodiscard]] auto begin() const { return written().begin(); }
     [[nodiscard]] auto end() const { return written().end(); }
 
     /// The value under `key`, or null. Valid until the dictionary is changed.
     [[nodiscard]] const Value* find(std::string_view key) const;
-    [[nodiscard]] bool contains(std::string_view key) const { return indexOf(key).has_value(); }
+    [[nodiscard]] bool contains(std::string_view key) const { return find(key) != nullptr; }
     /// The value under `key`, or none.
     [[nodiscard]] const Value& operator[](std::string_view key) const;
 
@@ -173,6 +174,9 @@ public:
     /// Has the bytes written, as all that is set before and after would have it, when somebody looks for
     /// values. The first time, when the keys may not be there yet, they are written at once.
     void writeLater(const Writing<Dictionary>& writing, Bytes bytes);
+    /// Has the key removed, likewise. For one key of a dictionary that comes and goes; a second one is
+    /// removed at once, since the order in which several come back could not be told later.
+    void removeLater(std::string_view key);
 
     [[nodiscard]] bool isFrozen() const { return _frozen; }
 
@@ -184,7 +188,7 @@ private:
     };
     static constexpr std::uint64_t neverChanged = ~std::uint64_t{0};
     struct Later : LaterWriting<Dictionary> {
-        bool hasKeys = false; ///< all its keys have been set and none has been removed
+        bool hasKeys = false; ///< all its keys have been set and none has been removed, but for `removeLater`
     };
 
     /// The entries, after what was to be written later has been.
@@ -197,12 +201,20 @@ private:
     [[nodiscard]] DictionaryRef frozenCopy() const;
     [[nodiscard]] bool isCopy(const Dictionary& copy) const;
     void becomeCopyOf(const Dictionary& source);
-    [[nodiscard]] std::optional<std::size_t> indexOf(std::string_view key) const;
+    static constexpr std::size_t nowhere = ~std::size_t{0};
+    /// The key's place in `_entries`, or nowhere.
+    [[nodiscard]] std::size_t indexOf(std::string_view key) const;
     Value& slot(std::string_view key);
+    void erase(std::size_t index);
+    /// What `removeLater` has done later: the bytes are the key.
+    static void eraseKey(Dictionary& dictionary, Bytes key, const void*);
     void rebuildIndex();
     void expectMutable() const;
 
     std::vector<Entry> _entries;
+    /// Where keys were found last, by where in memory they stood when they were asked for: most are constants
+    /// and asked for again and again. Hints only.
+    mutable std::array<std::uint8_t, 16> _found{};
     /// Key to place in `_entries`; empty while there are few entries.
     std::unordered_map<std::string, std::size_t, Hash, std::equal_to<>> _index;
     std::vector<Later> _later;

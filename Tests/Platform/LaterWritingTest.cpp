@@ -3,6 +3,8 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
+#include <iterator>
+#include <random>
 #include <string>
 #include <vector>
 
@@ -114,6 +116,81 @@ TEST(LaterWritingTest, ARemovedKeyComesBackAtTheEnd) {
     EXPECT_THAT(textsOf(node), ElementsAre(Pair("B", "2")));
     later(node, ab, 3);
     EXPECT_THAT(textsOf(node), ElementsAre(Pair("B", "3"), Pair("A", "3")));
+}
+
+TEST(LaterWritingTest, AKeyThatIsRemovedLaterIsGoneWhenSomebodyLooks) {
+    Dictionary node;
+    later(node, ab, 1);
+    later(node, a, 1);
+    writings = 0;
+    later(node, ab, 2);
+    node.removeLater("B");
+    later(node, a, 3);
+    EXPECT_EQ(writings, 0);
+    EXPECT_FALSE(node.contains("B"));
+    EXPECT_EQ(node.size(), 1u);
+    EXPECT_THAT(textsOf(node), ElementsAre(Pair("A", "3")));
+    node.removeLater("B");
+    later(node, ab, 4);
+    EXPECT_THAT(textsOf(node), ElementsAre(Pair("A", "4"), Pair("B", "4")));
+    node.removeLater("A"); // a second one goes at once
+    EXPECT_THAT(textsOf(node), ElementsAre(Pair("B", "4")));
+    later(node, ab, 5);
+    EXPECT_THAT(textsOf(node), ElementsAre(Pair("B", "5"), Pair("A", "5")));
+    EXPECT_THROW(Value(std::make_shared<Dictionary>(node)).copy().asDictionary()->removeLater("B"),
+                 std::logic_error);
+}
+
+/// What writing later must look like: the same done at once.
+class AtOnce {
+public:
+    void write(const Keys& keys, std::uint8_t byte) {
+        const std::vector<std::uint8_t> bytes{byte};
+        setKeys(node, bytes, &keys);
+    }
+
+    Dictionary node;
+};
+
+TEST(LaterWritingTest, NobodyCanTellItFromWritingAtOnce) {
+    const Keys bc{{"B", "C"}};
+    const Keys* const keys[] = {&a, &b, &ab, &bc};
+    for (unsigned seed = 0; seed < 300; ++seed) {
+        SCOPED_TRACE(seed);
+        std::mt19937 random(seed);
+        const DictionaryRef node = makeDictionary();
+        AtOnce wanted;
+        std::vector<std::pair<Value, Dictionary>> copies;
+        for (int step = 0; step < 60; ++step) {
+            const auto byte = static_cast<std::uint8_t>(step);
+            switch (random() % 9) {
+            case 0:
+                node->removeLater("B");
+                wanted.node.remove("B");
+                break;
+            case 1:
+                node->setText("D", std::to_string(step));
+                wanted.node.setText("D", std::to_string(step));
+                break;
+            case 2: EXPECT_EQ(node->remove("A"), wanted.node.remove("A")); break;
+            case 3: EXPECT_EQ(textsOf(*node), textsOf(wanted.node)); break;
+            case 4: copies.emplace_back(Value(node).copy(), wanted.node); break;
+            default: {
+                const Keys& chosen = *keys[random() % std::size(keys)];
+                later(*node, chosen, byte);
+                wanted.write(chosen, byte);
+            }
+            }
+            if (copies.size() > 3) { // so that they are used again
+                const auto& [copy, shown] = copies.front();
+                EXPECT_EQ(textsOf(*copy.asDictionary()), textsOf(shown));
+                copies.erase(copies.begin());
+            }
+        }
+        EXPECT_EQ(textsOf(*node), textsOf(wanted.node));
+        for (const auto& [copy, shown] : copies)
+            EXPECT_EQ(textsOf(*copy.asDictionary()), textsOf(shown));
+    }
 }
 
 TEST(LaterWritingTest, AnArrayIsMadeAnew) {
