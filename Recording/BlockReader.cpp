@@ -58,25 +58,24 @@ Result<Done> BlockReader::expectSection() {
     return Done{};
 }
 
-std::optional<BlockReader::Block> BlockReader::next() {
-    _input.skip(std::exchange(_present, 0));
+const BlockReader::Block* BlockReader::next() {
+    _input.skip(std::exchange(_present.length, 0));
     for (;;) {
         if (!_input.ensure(1))
-            return std::nullopt;
-        Block block;
-        const Fault fault = examine(block);
+            return nullptr;
+        const Fault fault = examine(_present);
         if (fault == Fault::None) {
-            _present = block.length;
-            _bigEndian = block.bigEndian;
-            return block;
+            _bigEndian = _present.bigEndian;
+            return &_present;
         }
-        passDamage(fault, block);
+        passDamage(fault, std::exchange(_present, Block()));
     }
 }
 
 /// Looks at the block that the input stands at, reading as much of it as its length says.
 BlockReader::Fault BlockReader::examine(Block& block) {
     block.offset = _input.offset();
+    block.length = 0;
     if (!_input.ensure(pcapng::blockOverhead))
         return Fault::CutOff;
     const Bytes header = _input.available();

@@ -21,7 +21,7 @@ public:
         std::uint32_t length = 0;
         bool bigEndian = false;   ///< the byte order of its section
         std::uint64_t offset = 0; ///< where in the file it begins
-        Bytes bytes;              ///< all of it; valid until the next call of `next`
+        Bytes bytes;              ///< all of it
 
         /// What stands between its first length and its last.
         [[nodiscard]] Bytes body() const;
@@ -35,9 +35,11 @@ public:
 
     /// Whether the input begins as a pcapng file does; to be asked before the first `next`.
     [[nodiscard]] Result<Done> expectSection();
-    /// The next whole block; none at the end, or when reading failed, and ever after.
-    [[nodiscard]] std::optional<Block> next();
+    /// The next whole block, good until the next call; null at the end, or when reading failed, and ever
+    /// after.
+    [[nodiscard]] const Block* next();
     /// What was left out before the block, or the end, that `next` last gave; without its record number.
+    [[nodiscard]] bool hasLoss() const { return _loss.has_value(); }
     [[nodiscard]] std::optional<Loss> takeLoss() { return std::exchange(_loss, std::nullopt); }
     /// A shared window on the block that `next` last gave. Precondition: it lies inside the block.
     [[nodiscard]] Data part(std::size_t offset, std::size_t length) const {
@@ -55,7 +57,7 @@ private:
     [[nodiscard]] bool standsAtBlock();
 
     ChunkedInput _input;
-    std::size_t _present = 0; ///< length of the block that `next` last gave
+    Block _present; ///< what `next` last gave
     bool _bigEndian = false;
     std::optional<Loss> _loss;
 };

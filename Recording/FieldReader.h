@@ -2,6 +2,7 @@
 
 #include "Platform/Bytes.h"
 
+#include <bit>
 #include <cstddef>
 #include <cstdint>
 
@@ -13,29 +14,19 @@ class FieldReader {
 public:
     FieldReader(Bytes bytes, bool bigEndian) : _bytes(bytes), _bigEndian(bigEndian) {}
 
-    [[nodiscard]] std::uint16_t u16(std::size_t offset) { return number<std::uint16_t, 2>(offset); }
-    [[nodiscard]] std::uint32_t u32(std::size_t offset) { return number<std::uint32_t, 4>(offset); }
-    [[nodiscard]] std::uint64_t u64(std::size_t offset) { return number<std::uint64_t, 8>(offset); }
+    [[nodiscard]] std::uint16_t u16(std::size_t offset) { return number<std::uint16_t>(offset); }
+    [[nodiscard]] std::uint32_t u32(std::size_t offset) { return number<std::uint32_t>(offset); }
+    [[nodiscard]] std::uint64_t u64(std::size_t offset) { return number<std::uint64_t>(offset); }
     [[nodiscard]] bool isGood() const { return _good; }
 
 private:
-    template <class Number, std::size_t width>
+    template <class Number>
     [[nodiscard]] Number number(std::size_t offset) {
-        if (offset > _bytes.size() || width > _bytes.size() - offset) {
+        if (offset > _bytes.size() || sizeof(Number) > _bytes.size() - offset) {
             _good = false;
             return 0;
         }
-        const auto bytes = _bytes.subspan(offset).template first<width>();
-        std::uint64_t value = 0;
-        // Two loops, each of which compilers turn into one load.
-        if (_bigEndian) {
-            for (std::size_t i = 0; i < width; ++i)
-                value |= std::uint64_t{bytes[i]} << 8 * (width - 1 - i);
-        } else {
-            for (std::size_t i = 0; i < width; ++i)
-                value |= std::uint64_t{bytes[i]} << 8 * i;
-        }
-        return static_cast<Number>(value);
+        return numberAt<Number>(&_bytes[offset], _bigEndian ? std::endian::big : std::endian::little);
     }
 
     Bytes _bytes;

@@ -67,7 +67,7 @@ std::optional<InterfaceDescription> InterfaceDescription::read(Bytes body, bool 
     return description;
 }
 
-std::optional<Time> InterfaceDescription::time(std::uint64_t stamp) const {
+std::optional<Time> InterfaceDescription::timeOfAny(std::uint64_t stamp) const {
     const Wide moment = nanoseconds(stamp, timeResolution) + Wide{timeOffset_seconds} * nanosecondsPerSecond;
     if (moment < std::numeric_limits<std::int64_t>::min() ||
         moment > std::numeric_limits<std::int64_t>::max())

@@ -3,7 +3,9 @@
 #include "Platform/Bytes.h"
 #include "Platform/Clock.h"
 
+#include <chrono>
 #include <cstdint>
+#include <limits>
 #include <optional>
 #include <string>
 
@@ -22,7 +24,16 @@ struct InterfaceDescription {
 
     /// The moment that a packet's time stamp means, to the nanosecond below; none where it lies outside of
     /// what `Time` can hold (the years 1678 to 2262).
-    [[nodiscard]] std::optional<Time> time(std::uint64_t stamp) const;
+    [[nodiscard]] std::optional<Time> time(std::uint64_t stamp) const {
+        constexpr std::uint64_t latest = std::numeric_limits<std::int64_t>::max();
+        // As recordings of ours are.
+        if (timeResolution == 9 && timeOffset_seconds == 0 && stamp <= latest)
+            return Time(std::chrono::nanoseconds(static_cast<std::int64_t>(stamp)));
+        return timeOfAny(stamp);
+    }
+
+private:
+    [[nodiscard]] std::optional<Time> timeOfAny(std::uint64_t stamp) const;
 };
 
 } // namespace velmora

@@ -36,7 +36,7 @@ Result<std::unique_ptr<RecordingReader>> RecordingReader::open(ChunkedInput inpu
     if (const Result<Done> section = reader->_blocks.expectSection(); !section)
         return Failure{section.reason()};
     while (!reader->_settled) {
-        std::optional<Block> block = reader->nextBlock();
+        const Block* const block = reader->nextBlock();
         if (!block)
             break;
         if (holdsPacket(block->type)) {
@@ -49,22 +49,25 @@ Result<std::unique_ptr<RecordingReader>> RecordingReader::open(ChunkedInput inpu
 }
 
 std::optional<LoggedMessage> RecordingReader::next() {
-    for (;;) {
-        const std::optional<Block> block = _waiting ? std::exchange(_waiting, std::nullopt) : nextBlock();
+    std::optional<LoggedMessage> message; // made where it is returned: there are millions of them
+    while (!message) {
+        const Block* const block = _waiting ? std::exchange(_waiting, nullptr) : nextBlock();
         if (!block)
-            return std::nullopt;
-        if (!holdsPacket(block->type))
+            break;
+        if (holdsPacket(block->type))
+            takeMessage(*block, message);
+        else
             takeIn(*block);
-        else if (std::optional<LoggedMessage> message = messageOf(*block))
-            return message;
     }
+    return message;
 }
 
-std::optional<RecordingReader::Block> RecordingReader::nextBlock() {
-    std::optional<Block> block = _blocks.next();
-    if (std::optional<Loss> loss = _blocks.takeLoss()) {
-        loss->recordNumber = _packets + 1;
-        addLoss(*std::move(loss));
+const RecordingReader::Block* RecordingReader::nextBlock() {
+    const Block* const block = _blocks.next();
+    if (_blocks.hasLoss()) {
+        Loss loss = *_blocks.takeLoss();
+        loss.recordNumber = _packets + 1;
+        addLoss(std::move(loss));
     }
     return block;
 }
@@ -114,7 +117,7 @@ void RecordingReader::takeInInterface(const Block& block) {
         interface.use = Use::OtherTechnology;
 }
 
-std::optional<LoggedMessage> RecordingReader::messageOf(const Block& block) {
+void RecordingReader::takeMessage(const Block& block, std::optional<LoggedMessage>& message) {
     using Use = Interface::Use;
     const std::uint64_t number = ++_packets;
     const Packet packet = packetOf(block);
@@ -122,21 +125,25 @@ std::optional<LoggedMessage> RecordingReader::messageOf(const Block& block) {
         packet.interface < _interfaces.size() ? &_interfaces[packet.interface] : nullptr;
     if (interface != nullptr && interface->use == Use::OtherLinkType) {
         ++_passedOver.packets;
-        return std::nullopt;
+        return;
     }
     const std::size_t room = block.length - 4;
     const bool whole = packet.offset <= room && packet.captured <= room - packet.offset &&
                        packet.captured == packet.original && packet.captured <= maximumMessageSize;
     std::optional<Time> time;
     if (interface != nullptr && interface->use == Use::Messages && whole)
-        time = packet.stamp ? interface->description.time(*packet.stamp) : _lastTime;
+        time = packet.hasStamp ? interface->description.time(packet.stamp) : _lastTime;
     if (!time) {
         // Thousands of these are possible; only those that are kept need their words.
         lose(block, number, keepsLoss() ? whyUnusable(packet, block) : std::string());
-        return std::nullopt;
+        return;
     }
     _lastTime = *time;
-    return LoggedMessage{*time, _blocks.part(packet.offset, packet.captured), number, block.offset};
+    LoggedMessage& made = message.emplace();
+    made.time = *time;
+    made.message = _blocks.part(packet.offset, packet.captured);
+    made.number = number;
+    made.offset = block.offset;
 }
 
 /// Fields that the block is too short for read as 0, and its bytes then begin past its end.
@@ -156,6 +163,7 @@ RecordingReader::Packet RecordingReader::packetOf(const Block& block) const {
     // The obsolete block has a 16-bit interface, and a count of dropped packets where the others have its
     // top.
     packet.interface = block.type == BlockType::Packet ? fields.u16(8) : fields.u32(8);
+    packet.hasStamp = true;
     packet.stamp = std::uint64_t{fields.u32(12)} << 32 | fields.u32(16);
     packet.captured = fields.u32(20);
     packet.original = fields.u32(24);
@@ -187,8 +195,7 @@ std::string RecordingReader::whyUnusable(const Packet& packet, const Block& bloc
     if (packet.captured > maximumMessageSize)
         return "message of " + std::to_string(packet.captured) + " bytes, wanted at most " +
                std::to_string(maximumMessageSize);
-    return "time stamp " + std::to_string(packet.stamp.value_or(0)) +
-           " lies outside of the years 1678 to 2262";
+    return "time stamp " + std::to_string(packet.stamp) + " lies outside of the years 1678 to 2262";
 }
 
 void RecordingReader::lose(const Block& block, std::uint64_t number, std::string reason) {

@@ -57,24 +57,26 @@ private:
     /// A packet block's fields, whichever of the three kinds it is.
     struct Packet {
         std::uint32_t interface = 0;
-        std::optional<std::uint64_t> stamp; ///< simple packets have none
-        std::size_t offset = 0;             ///< where in the block its bytes begin
-        std::uint32_t captured = 0;         ///< bytes in the block
-        std::uint32_t original = 0;         ///< bytes of the message
+        bool hasStamp = false; ///< simple packets have none
+        std::uint64_t stamp = 0;
+        std::size_t offset = 0;     ///< where in the block its bytes begin
+        std::uint32_t captured = 0; ///< bytes in the block
+        std::uint32_t original = 0; ///< bytes of the message
     };
 
     explicit RecordingReader(ChunkedInput input) : _blocks(std::move(input)) {}
 
-    [[nodiscard]] std::optional<Block> nextBlock();
+    [[nodiscard]] const Block* nextBlock();
     void takeIn(const Block& block);
     void takeInInterface(const Block& block);
-    [[nodiscard]] std::optional<LoggedMessage> messageOf(const Block& block);
+    /// Makes the message of a packet, unless it is none of ours or lost.
+    void takeMessage(const Block& block, std::optional<LoggedMessage>& message);
     [[nodiscard]] Packet packetOf(const Block& block) const;
     [[nodiscard]] std::string whyUnusable(const Packet& packet, const Block& block) const;
     void lose(const Block& block, std::uint64_t number, std::string reason);
 
     BlockReader _blocks;
-    std::optional<Block> _waiting;      ///< the packet that `open` came upon
+    const Block* _waiting = nullptr;    ///< the packet that `open` came upon
     std::vector<Interface> _interfaces; ///< of the present section
     bool _settled = false;              ///< an interface of log messages has been met
     std::string _technology;
