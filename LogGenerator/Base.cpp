@@ -30,15 +30,15 @@ Base* Base::initWithDict(ClassDictionary& classDict, CodeDictionary& codeDict) {
 }
 
 void Base::updateSectionRef(const Value& node) {
-    _dictionaryRef = node.dictionaryRef();
-    _arrayRef = node.arrayRef();
+    _dictionaryRef.refer(node.dictionaryRef());
+    _arrayRef.refer(node.arrayRef());
     logLine(LogPriority::Warning, getSectionName());
 }
 
 Value Base::node() const {
-    if (DictionaryRef dictionary = _dictionaryRef.lock())
+    if (DictionaryRef dictionary = _dictionaryRef.share())
         return dictionary;
-    return _arrayRef.lock();
+    return _arrayRef.share();
 }
 
 void Base::updateLogCodeDict(CodeDictionary& codeDict) {
@@ -79,14 +79,14 @@ std::int16_t Base::lookUpECNO(std::uint32_t value) {
 }
 
 void Base::setText(std::string_view label, std::string_view text) const {
-    if (const DictionaryRef node = dictionary())
+    if (Dictionary* const node = dictionary())
         node->setText(label, text);
 }
 
 bool Base::show(const Record& record, const Layout& layout) const {
     if (record.size() < layout.minimumLength)
         return false;
-    if (const DictionaryRef node = dictionary())
+    if (Dictionary* const node = dictionary())
         writeFieldsLater(*node, record, layout);
     return true;
 }
@@ -99,7 +99,7 @@ void Base::showList(const ListField& field, const CountedList& list, std::uint32
         node.set(wanted.label, entries);
     };
     reportMissingEntries(list, logCode);
-    if (const DictionaryRef node = dictionary())
+    if (Dictionary* const node = dictionary())
         node->writeLater({write, &field}, list.entries().bytes());
 }
 
@@ -121,12 +121,12 @@ void Base::reportMissingEntries(std::size_t whole, std::size_t count, std::uint3
 }
 
 void Base::clearElements() const {
-    if (const ArrayRef node = array())
+    if (Array* const node = array())
         clearElementsInArray(*node);
 }
 
 void Base::replaceElements(const Array& newElements) const {
-    if (const ArrayRef node = array())
+    if (Array* const node = array())
         replaceArray(*node, newElements);
 }
 
@@ -139,7 +139,7 @@ void Base::showRows(const CountedList& list, const Layout& layout, std::uint32_t
 }
 
 void Base::replaceElementsLater(const Writing<Array>& writing, const Record& record) const {
-    if (const ArrayRef node = array()) {
+    if (Array* const node = array()) {
         ArrayLock::Guard guard;
         node->writeLater(writing, record.bytes());
     }

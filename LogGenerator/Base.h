@@ -82,8 +82,8 @@ protected:
 
     /// The node, null before the display is built and where it is of the other kind. A value written to no
     /// node goes nowhere.
-    [[nodiscard]] DictionaryRef dictionary() const { return _dictionaryRef.lock(); }
-    [[nodiscard]] ArrayRef array() const { return _arrayRef.lock(); }
+    [[nodiscard]] Dictionary* dictionary() const { return _dictionaryRef.get(); }
+    [[nodiscard]] Array* array() const { return _arrayRef.get(); }
 
     /// Writes one value into the dictionary node.
     void setText(std::string_view label, std::string_view text) const;
@@ -97,7 +97,7 @@ protected:
     template <void (*write)(Dictionary& node, const Record& record)>
     void showWith(const Record& record) const {
         constexpr auto later = [](Dictionary& node, Bytes bytes, const void*) { write(node, Record(bytes)); };
-        if (const DictionaryRef node = dictionary())
+        if (Dictionary* const node = dictionary())
             node->writeLater({later, nullptr}, record.bytes());
     }
     /// Puts a new array of rows (see `rows`) into the dictionary node; one that the display held under the
@@ -141,9 +141,26 @@ protected:
 private:
     void replaceElementsLater(const Writing<Array>& writing, const Record& record) const;
 
-    /// `sectionRef`: the one of the two that fits the node's kind. Weak, since the display owns the node.
-    std::weak_ptr<Dictionary> _dictionaryRef;
-    std::weak_ptr<Array> _arrayRef;
+    /// A node that the display owns. On the one thread there is, nothing takes it away while a record is
+    /// decoded, so that it is looked at without a share in it, which would cost more than to write there.
+    template <class Node>
+    class NodeRef {
+    public:
+        void refer(const std::shared_ptr<Node>& node) {
+            _watch = node;
+            _node = node.get();
+        }
+        [[nodiscard]] Node* get() const { return _watch.expired() ? nullptr : _node; }
+        [[nodiscard]] std::shared_ptr<Node> share() const { return _watch.lock(); }
+
+    private:
+        std::weak_ptr<Node> _watch;
+        Node* _node = nullptr;
+    };
+
+    /// `sectionRef`: the one of the two that fits the node's kind.
+    NodeRef<Dictionary> _dictionaryRef;
+    NodeRef<Array> _arrayRef;
     std::shared_ptr<CellList> _cells = std::make_shared<CellList>();
 };
 

@@ -46,12 +46,15 @@ private:
         std::size_t content = 0;
     };
 
-    /// Precondition: the bytes are there.
+    /// Precondition: the bytes, of which there are 1, 2, 4 or 8, are there.
     [[nodiscard]] std::uint64_t number(std::size_t offset, std::size_t width) const {
-        std::uint64_t value = 0;
-        for (std::size_t i = 0; i < width; ++i)
-            value = value << 8 | _list[offset + i];
-        return value;
+        const std::uint8_t* const bytes = &_list[offset];
+        switch (width) {
+        case 1: return *bytes;
+        case 2: return numberAt<std::uint16_t>(bytes, std::endian::big);
+        case 4: return numberAt<std::uint32_t>(bytes, std::endian::big);
+        default: return numberAt<std::uint64_t>(bytes, std::endian::big);
+        }
     }
 
     bool readTrailer() {
@@ -161,18 +164,34 @@ private:
                 cell.setNumber(key, static_cast<std::int64_t>(number(value.content, width)));
             return true;
         }
+        if (key == technologyKey || key == typeKey) {
+            // The cells share these as well.
+            Kind& kind = _kinds[valueIndex % _kinds.size()];
+            if (kind.object != valueIndex) {
+                if (!text(value, valueText))
+                    return false;
+                kind = {valueIndex, placeOf(valueText, cellTechnologies), placeOf(valueText, cellTypes)};
+            }
+            (key == technologyKey ? cell.kind.technology : cell.kind.type) =
+                key == technologyKey ? kind.technology : kind.type;
+            return true;
+        }
         if (!text(value, valueText))
             return false;
-        if (key == technologyKey)
-            cell.kind.technology = placeOf(valueText, cellTechnologies);
-        else if (key == typeKey)
-            cell.kind.type = placeOf(valueText, cellTypes);
-        else if (key < cellNumberCount)
+        if (key < cellNumberCount)
             cell.setNoNumber(key);
         return true;
     }
 
+    /// A text that says of which kind a cell is.
+    struct Kind {
+        std::size_t object = ~std::size_t{0};
+        std::uint8_t technology = 0;
+        std::uint8_t type = 0;
+    };
+
     Bytes _list;
+    std::array<Kind, 8> _kinds{};
     std::size_t _offsetWidth = 0;
     std::size_t _referenceWidth = 0;
     std::size_t _count = 0;

@@ -29,9 +29,18 @@ Cell cellOf(const Dictionary& fields) {
 } // namespace
 
 const std::vector<Cell>* CellList::read(const Data& record) {
+    if (_isRead)
+        return &_cells;
+    if (!readPayload(record))
+        return nullptr;
+    _isRead = _isOneRecord;
+    return &_cells;
+}
+
+bool CellList::readPayload(const Data& record) {
     const Bytes payload = record.from(headerLength).bytes();
     if (!_payload.empty() && std::equal(payload.begin(), payload.end(), _payload.begin(), _payload.end()))
-        return &_cells;
+        return true;
     _payload.clear();
     _cells.clear();
     bool good = readBinaryCells(payload, _cells);
@@ -42,11 +51,11 @@ const std::vector<Cell>* CellList::read(const Data& record) {
     if (!good) {
         _cells.clear();
         if (!readSlowly(record))
-            return nullptr;
+            return false;
     }
     if (payload.size() <= longestKept)
         _payload.assign(payload.begin(), payload.end());
-    return &_cells;
+    return true;
 }
 
 bool CellList::readSlowly(const Data& record) {

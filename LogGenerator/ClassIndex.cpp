@@ -21,9 +21,10 @@ Base* ClassIndex::getClass(std::string_view name) const {
 const std::vector<Base*>* ClassIndex::getSubscribers(std::uint32_t code) const {
     if (_routes.empty() || _routedCodes != codeDictionary.size())
         makeRoutes();
-    std::size_t place = code % _routes.size();
+    const std::size_t mask = _routes.size() - 1; // a power of two less one
+    std::size_t place = code & mask;
     while (_routes[place].subscribers && _routes[place].code != code)
-        place = (place + 1) % _routes.size();
+        place = (place + 1) & mask;
     return _routes[place].subscribers;
 }
 

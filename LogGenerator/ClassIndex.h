@@ -26,6 +26,8 @@ public:
     [[nodiscard]] const std::vector<Base*>* getSubscribers(std::uint32_t code) const;
     /// Every wanted code as a decimal string.
     [[nodiscard]] std::vector<std::string> getAllLogCodes() const;
+    /// What the sections read the cell information array with.
+    [[nodiscard]] CellList& cellList() const { return *_cellList; }
     /// Two log lines on what kind of object `classDict` is.
     void status() const;
 

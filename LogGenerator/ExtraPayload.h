@@ -17,7 +17,7 @@ namespace velmora {
 /// 13-byte header and holds what it found for as long as it lives.
 
 /// The payloads that a section read last and what they held. The SIM's files and the contexts are told again
-/// and again without having changed, in both forms by turns: two of them are kept.
+/// and again without having changed, or as they were before, in both forms by turns: some of them are kept.
 class RememberedPayloads {
 public:
     /// What the record's payload holds, as readPropertyList gives it.
@@ -28,7 +28,7 @@ private:
         std::vector<std::uint8_t> bytes;
         Value value;
     };
-    std::array<Payload, 2> _payloads;
+    std::array<Payload, 8> _payloads;
     std::size_t _next = 0; ///< which is forgotten next
 };
 

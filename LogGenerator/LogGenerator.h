@@ -38,6 +38,11 @@ public:
     /// What a snapshot saves: dictionaries that each hold a "Description" string.
     [[nodiscard]] virtual ArrayRef getSaveContentsFromState(const Dictionary& state) const = 0;
 
+    /// Whether every refresh is kept in the history, for a snapshot, as it is unless this says otherwise. Who
+    /// looks at nothing but the display does without: "DisplayState" and "History" then stay as they are, and
+    /// a refresh copies nothing.
+    void setKeepsHistory(bool keeps) { _keepsHistory = keeps; }
+
     /// A new decoder for the technology that the telephony service names by one of its constants; null for
     /// any other name, and where the decoder cannot be made.
     [[nodiscard]] static std::unique_ptr<LogGenerator> generatorFromTechnology(std::string_view technology,
@@ -50,9 +55,11 @@ public:
 
 protected:
     [[nodiscard]] const Clock& clock() const { return _clock; }
+    [[nodiscard]] bool keepsHistory() const { return _keepsHistory; }
 
 private:
     const Clock& _clock;
+    bool _keepsHistory = true;
 };
 
 } // namespace velmora

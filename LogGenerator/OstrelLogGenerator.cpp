@@ -61,11 +61,14 @@ ArrayRef OstrelLogGenerator::getSaveContentsFromState(const Dictionary& state) c
     return contents;
 }
 
-void OstrelLogGenerator::handOverBinData(Dictionary& state) {
+void OstrelLogGenerator::keepRefresh(Dictionary& state) {
+    if (!keepsHistory())
+        return;
     const std::size_t usual = _binData.size();
     state.set("DisplayState", Data(std::move(_binData)));
     _binData = {};
     _binData.reserve(usual);
+    updateHistoryInState(state, clock());
 }
 
 } // namespace velmora

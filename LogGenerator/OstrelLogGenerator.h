@@ -26,8 +26,17 @@ protected:
     /// Raw log messages since the last display, one behind the other.
     std::vector<std::uint8_t> _binData;
 
-    /// Moves the raw messages into the state under "DisplayState" and starts collecting anew.
-    void handOverBinData(Dictionary& state);
+    /// Appends a message to them, where a history is kept.
+    void keep(const Data& message) {
+        if (!keepsHistory())
+            return;
+        const Bytes bytes = message.bytes();
+        _binData.insert(_binData.end(), bytes.begin(), bytes.end());
+    }
+
+    /// Ends a refresh: moves the raw messages into the state under "DisplayState", starts collecting anew and
+    /// appends to the history, where one is kept.
+    void keepRefresh(Dictionary& state);
 };
 
 } // namespace velmora

@@ -62,7 +62,7 @@ void OstrelLogGenerator2::updateState(Dictionary& state, const Data& data) {
     if (!_sectionsHaveNodes || !state.contains("Display"))
         static_cast<void>(getDisplayFromState(state));
     updateWithData(data);
-    keep(data);
+    keep(data); // every message, routed or not, with its prefix
 }
 
 void OstrelLogGenerator2::updateStateTelling(Dictionary& state, const Data& data, MessageEffects& effects) {
@@ -80,11 +80,6 @@ void OstrelLogGenerator2::updateStateTelling(Dictionary& state, const Data& data
                 effects.section((*section)->getSectionName(), node);
 }
 
-void OstrelLogGenerator2::keep(const Data& message) {
-    const Bytes bytes = message.bytes();
-    _binData.insert(_binData.end(), bytes.begin(), bytes.end());
-}
-
 void OstrelLogGenerator2::updateWithData(const Data& message) {
     static_cast<void>(route(message));
 }
@@ -92,7 +87,10 @@ void OstrelLogGenerator2::updateWithData(const Data& message) {
 std::optional<std::uint32_t> OstrelLogGenerator2::route(const Data& message) {
     if (message.size() < headerLength)
         return std::nullopt;
-    const Data data = message.bytes().front() == prefixMarker ? message.from(prefixLength) : message;
+    std::optional<Data> stripped;
+    if (message.bytes().front() == prefixMarker)
+        stripped = message.from(prefixLength);
+    const Data& data = stripped ? *stripped : message;
     const Record record(data);
     const std::uint8_t type = record.u8(0);
     if (type != basebandType && type != extraType) {
@@ -100,9 +98,11 @@ std::optional<std::uint32_t> OstrelLogGenerator2::route(const Data& message) {
         return std::nullopt;
     }
     const std::uint32_t code = record.u16(3) + (type == extraType ? firstExtraCode : 0);
-    if (const std::vector<Base*>* subscribers = cIndex->getSubscribers(code))
+    if (const std::vector<Base*>* subscribers = cIndex->getSubscribers(code)) {
+        const CellList::OneRecord one(cIndex->cellList());
         for (Base* section : *subscribers)
             section->updateWithData(data, code);
+    }
     return code;
 }
 
@@ -193,8 +193,7 @@ void OstrelLogGenerator2::printDict(const Value& object) const {
 
 Value OstrelLogGenerator2::generateLogUsingState(Dictionary& state) {
     Value display = getDisplayFromState(state);
-    handOverBinData(state);
-    updateHistoryInState(state, clock());
+    keepRefresh(state);
     return display;
 }
 

@@ -48,8 +48,6 @@ public:
 private:
     /// Does what `updateWithData` does. Gives the code; none for a message that was dropped.
     std::optional<std::uint32_t> route(const Data& message);
-    /// Every message is kept for the log, routed or not, with its prefix.
-    void keep(const Data& message);
     /// Gives the sections of this decoder their nodes of a display that an earlier decoder built.
     void adoptDisplay(const Value& object);
 

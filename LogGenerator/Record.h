@@ -2,6 +2,7 @@
 
 #include "Platform/Bytes.h"
 
+#include <bit>
 #include <cstddef>
 #include <cstdint>
 #include <stdexcept>
@@ -42,16 +43,14 @@ public:
     [[nodiscard]] std::int8_t i8(std::size_t offset) const { return static_cast<std::int8_t>(u8(offset)); }
     [[nodiscard]] std::uint16_t u16(std::size_t offset) const {
         expect(offset, 2);
-        return static_cast<std::uint16_t>(_bytes[offset] | _bytes[offset + 1] << 8);
+        return numberAt<std::uint16_t>(&_bytes[offset], std::endian::little);
     }
     [[nodiscard]] std::int16_t i16(std::size_t offset) const {
         return static_cast<std::int16_t>(u16(offset));
     }
     [[nodiscard]] std::uint32_t u32(std::size_t offset) const {
-        // Byte by byte, of which compilers make one load.
         expect(offset, 4);
-        return std::uint32_t{_bytes[offset]} | std::uint32_t{_bytes[offset + 1]} << 8 |
-               std::uint32_t{_bytes[offset + 2]} << 16 | std::uint32_t{_bytes[offset + 3]} << 24;
+        return numberAt<std::uint32_t>(&_bytes[offset], std::endian::little);
     }
     [[nodiscard]] std::int32_t i32(std::size_t offset) const {
         return static_cast<std::int32_t>(u32(offset));

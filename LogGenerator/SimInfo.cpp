@@ -44,7 +44,7 @@ void SimInfo::updateWithData(const Data& data, std::uint32_t logCode) {
     if (logCode != 0xFF0000)
         return;
     const LogCode_0xFF0000::SIMFileReader reader(data, _payloads);
-    const DictionaryRef node = dictionary();
+    Dictionary* const node = dictionary();
     if (!node)
         return;
     for (const SIMFile& file : simFiles)

@@ -14,9 +14,9 @@ CSVRows::CSVRows(Output& output, bool isLive, const DecodeOptions& options, cons
     _fileCell = cell.view();
 }
 
-void CSVRows::messageDecoded(const LoggedMessage& message, const Value& display) {
+void CSVRows::messageDecoded(const LoggedMessage& message, const Dictionary& state) {
     if (_options.every == DecodeOptions::Every::Message)
-        writeRow(message.time, display);
+        writeRow(message.time, state["Display"]);
 }
 
 void CSVRows::refreshed(Time tick, const Decoded& decoded) {

@@ -106,6 +106,7 @@ public:
     std::optional<Time> tick;
     ArrayRef contents;
 
+    [[nodiscard]] bool wantsHistory() const override { return true; }
     void refreshed(Time refreshTick, const Decoded&) override { tick = refreshTick; }
     void ended(const LogGenerator& decoder, const Dictionary& state) override {
         contents = decoder.getSaveContentsFromState(state);

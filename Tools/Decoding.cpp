@@ -22,6 +22,8 @@ Result<Decoded> decodeMessages(MessageReader& reader, const DecodingRequest& req
     if (!decoder)
         return Failure{decoder.reason() + (named.empty() ? "; --technology supplies it" : "")};
 
+    (*decoder)->setKeepsHistory(observer.wantsHistory());
+
     const NotedResources resources;
     Decoded decoded;
     decoded.technology = shortTechnologyName(named);
@@ -37,29 +39,40 @@ Result<Decoded> decodeMessages(MessageReader& reader, const DecodingRequest& req
     };
     MessageEffects* const effects = observer.effects();
     const Time first = message ? message->time : Time();
-    for (; message && !observer.hasEnough(); message = reader.next()) {
+    const auto decode = [&](const LoggedMessage& logged) {
         if (request.progress)
-            request.progress->at(message->offset);
-        fileTellsRefreshes = fileTellsRefreshes || message->refresh;
-        if (!request.range.contains(message->time, first)) {
-            if (message->refresh && !isRefreshed)
-                refresh(*message->refresh);
-            continue;
+            request.progress->at(logged.offset);
+        fileTellsRefreshes = fileTellsRefreshes || logged.refresh;
+        if (!request.range.contains(logged.time, first)) {
+            if (logged.refresh && !isRefreshed)
+                refresh(*logged.refresh);
+            return;
         }
-        if (const std::optional<Time> tick = ticks.before(message->time); tick && !fileTellsRefreshes)
+        if (const std::optional<Time> tick = ticks.before(logged.time); tick && !fileTellsRefreshes)
             refresh(*tick);
-        context.atRecord(message->number, message->offset);
-        clock.setNow(message->time);
-        observer.messageComes(*message);
+        context.atRecord(logged.number, logged.offset);
+        clock.setNow(logged.time);
+        observer.messageComes(logged);
         if (effects)
-            (*decoder)->updateStateTelling(state, message->message, *effects);
+            (*decoder)->updateStateTelling(state, logged.message, *effects);
         else
-            (*decoder)->updateState(state, message->message);
+            (*decoder)->updateState(state, logged.message);
         ++decoded.messages;
         isRefreshed = false;
-        observer.messageDecoded(*message, state["Display"]);
-        if (message->refresh)
-            refresh(*message->refresh);
+        observer.messageDecoded(logged, state);
+        if (logged.refresh)
+            refresh(*logged.refresh);
+    };
+    bool more = message.has_value();
+    if (more && !observer.hasEnough())
+        decode(*message);
+    message.reset(); // gives its part of the reader's buffer back
+    while (more && !observer.hasEnough()) {
+        // Made where it is looked at instead of moved there: there are millions of them.
+        const std::optional<LoggedMessage> next = reader.next();
+        more = next.has_value();
+        if (more)
+            decode(*next);
     }
     if (const std::optional<Time> tick = ticks.last(); tick && !isRefreshed)
         refresh(*tick);

@@ -23,7 +23,8 @@ struct Decoded {
     Value display; ///< as it stands after the latest refresh; none where there was nothing to show
 };
 
-/// Is told of decoding as it goes on. Displays belong to the decoder: they change with the next message.
+/// Is told of decoding as it goes on. Displays and the state belong to the decoder: they change with the next
+/// message.
 class DecodingObserver {
 public:
     virtual ~DecodingObserver() = default;
@@ -33,8 +34,11 @@ public:
     /// Who is to be told what each message concerned; asked once. Null, without which decoding is faster, for
     /// nobody.
     [[nodiscard]] virtual MessageEffects* effects() { return nullptr; }
+    /// Whether the decoder keeps its history, for what a snapshot saves; asked once. Decoding without is
+    /// faster.
+    [[nodiscard]] virtual bool wantsHistory() const { return false; }
     /// A wanted message has been decoded.
-    virtual void messageDecoded(const LoggedMessage&, const Value& /*display*/) {}
+    virtual void messageDecoded(const LoggedMessage&, const Dictionary& /*state*/) {}
     /// The display has been refreshed; `decoded` holds it, and what was decoded up to here.
     virtual void refreshed(Time /*tick*/, const Decoded& /*decoded*/) {}
     /// The last refresh has been; the state is as the decoder leaves it.

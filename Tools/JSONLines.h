@@ -25,7 +25,7 @@ public:
     MessageLines(Output& output, bool isLive, const std::string& file);
     void messageComes(const LoggedMessage& message) override { _moment = message.time; }
     [[nodiscard]] MessageEffects* effects() override { return this; }
-    void messageDecoded(const LoggedMessage& message, const Value& display) override;
+    void messageDecoded(const LoggedMessage& message, const Dictionary& state) override;
 
 private:
     void sections(std::optional<std::uint32_t> code) override;

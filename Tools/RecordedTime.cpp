@@ -4,15 +4,14 @@
 
 namespace velmora {
 
-std::optional<Time> RecordedTicks::before(Time message) {
+/// Precondition: this is the first message, or the next tick is not after it.
+std::optional<Time> RecordedTicks::reach(Time message) {
     if (!_started) {
         _started = true;
         _next = message;
         advancePast(message);
         return std::nullopt;
     }
-    if (_exhausted || message < _next)
-        return std::nullopt;
     // Messages have come since the last tick: each call but the first follows one, and only the first of
     // several ticks that are due at once has had any.
     const Time tick = _next;

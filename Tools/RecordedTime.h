@@ -27,11 +27,16 @@ public:
 
     /// Takes in that a message with this time stamp comes next. Gives the tick that refreshes before it, if
     /// any.
-    [[nodiscard]] std::optional<Time> before(Time message);
+    [[nodiscard]] std::optional<Time> before(Time message) {
+        if (_started && (_exhausted || message < _next))
+            return std::nullopt;
+        return reach(message);
+    }
     /// The last tick, which follows the last message; none where there was no message.
     [[nodiscard]] std::optional<Time> last() const;
 
 private:
+    [[nodiscard]] std::optional<Time> reach(Time message);
     void advancePast(Time message);
 
     bool _started = false;

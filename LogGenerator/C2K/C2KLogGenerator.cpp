@@ -80,12 +80,12 @@ void C2KLogGenerator::updateStateTelling(Dictionary& state, const Data& data, Me
 
 void C2KLogGenerator::update(Dictionary& state, const Data& data, MessageEffects* effects) {
     // Builds the display on the first message.
-    static_cast<void>(getDisplayFromState(state));
-    const DictionaryRef lookup = state["Lookup"].dictionaryRef();
-    updateFromLog(data, lookup.get(), state, effects);
+    if (!state.contains("Display"))
+        static_cast<void>(getDisplayFromState(state));
+    updateFromLog(data, state["Lookup"].dictionaryRef(), state, effects);
 }
 
-void C2KLogGenerator::updateFromLog(const Data& data, const Dictionary* lookup, Dictionary& state,
+void C2KLogGenerator::updateFromLog(const Data& data, const DictionaryRef& lookup, Dictionary& state,
                                     MessageEffects* effects) {
     if (data.size() < headerLength) {
         if (effects)
@@ -105,15 +105,14 @@ void C2KLogGenerator::updateFromLog(const Data& data, const Dictionary* lookup, 
     const C2K::LogCodeParser* parser = C2K::parserOfCode(code);
     if (!parser)
         return;
-    parser->parse(record, state, C2K::Publisher(lookup, effects));
-    const Bytes bytes = stripped.bytes();
-    _binData.insert(_binData.end(), bytes.begin(), bytes.end());
+    _targets.use(lookup);
+    parser->parse(record, state, C2K::Publisher(_targets, effects));
+    keep(stripped);
 }
 
 Value C2KLogGenerator::generateLogUsingState(Dictionary& state) {
     Value display = getDisplayFromState(state);
-    handOverBinData(state);
-    updateHistoryInState(state, clock());
+    keepRefresh(state);
     return display;
 }
 

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "LogGenerator/C2K/Targets.h"
 #include "LogGenerator/OstrelLogGenerator.h"
 
 namespace velmora {
@@ -7,7 +8,8 @@ namespace velmora {
 /// The decoder of the technology Ostrel CDMA (CDMA2000 1x and EV-DO). It has no sections: the template
 /// "C2KTemplate" says which value stands under which label, and eight parsers, one a log code, put their
 /// values there through the lookup that is made of it. The generator holds nothing but the raw records since
-/// the last display; all else is in the state, so that a new decoder goes on where an earlier one ended.
+/// the last display, and what it has found in the lookup; all else is in the state, so that a new decoder
+/// goes on where an earlier one ended.
 ///
 /// State keys beside LogGenerator's: "Template" (the template as it was loaded), "Lookup" (value key to array
 /// of {"key": label, "dict": the display dictionary that holds it}), and the parsers' running values:
@@ -28,7 +30,7 @@ public:
     /// whether or not the parser accepted it. `lookup`: null where the display could not be built; then the
     /// parsers show nothing. A message below 13 bytes as it arrived is dropped silently. `effects`, unless
     /// null, is told of the values.
-    void updateFromLog(const Data& data, const Dictionary* lookup, Dictionary& state,
+    void updateFromLog(const Data& data, const DictionaryRef& lookup, Dictionary& state,
                        MessageEffects* effects = nullptr);
 
     /// Fills display and lookup from a template: a dictionary becomes a sub-screen, "_sorted" is copied, any
@@ -42,6 +44,8 @@ public:
 
 private:
     void update(Dictionary& state, const Data& data, MessageEffects* effects);
+
+    C2K::Targets _targets;
 };
 
 } // namespace velmora

@@ -1,5 +1,7 @@
 #include "LogGenerator/C2K/DataRate.h"
 
+#include <array>
+#include <cstring>
 #include <optional>
 
 namespace velmora::C2K {
@@ -11,6 +13,20 @@ constexpr double bitsPerKilobit = 1024;
 std::optional<std::int64_t> integerOf(const Value& value) {
     const std::int64_t* integer = value.asInteger();
     return integer ? std::optional(*integer) : std::nullopt;
+}
+
+/// From one record to a later one.
+struct Growth {
+    std::int64_t bits = 0;
+    std::int64_t steps = 0;
+};
+
+Value rateOf(Bytes bytes, const void*) {
+    Growth growth;
+    std::memcpy(&growth, bytes.data(), sizeof growth);
+    return NumberText("%.2f kbps",
+                      static_cast<double>(growth.bits) / (static_cast<double>(growth.steps) * bitsPerKilobit))
+        .text();
 }
 
 } // namespace
@@ -29,9 +45,11 @@ void updateDataRate(const DataRateKeys& keys, std::uint32_t sequence, std::uint6
     if (earlierSequence && earlierSent) {
         const auto steps = static_cast<std::int32_t>(sequence - static_cast<std::uint32_t>(*earlierSequence));
         if (steps >= 1) {
-            const auto bits = static_cast<std::int64_t>(sent - static_cast<std::uint64_t>(*earlierSent));
-            publisher.publish(keys.value,
-                              NumberText("%.2f kbps", static_cast<double>(bits) / (steps * bitsPerKilobit)));
+            const Growth growth{static_cast<std::int64_t>(sent - static_cast<std::uint64_t>(*earlierSent)),
+                                steps};
+            std::array<std::uint8_t, sizeof growth> bytes;
+            std::memcpy(bytes.data(), &growth, sizeof growth);
+            publisher.publishLater(keys.value, rateOf, nullptr, bytes);
         }
         note(keys.sequence2, *earlierSequence);
         note(keys.sent2, *earlierSent);

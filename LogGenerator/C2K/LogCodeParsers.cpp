@@ -9,9 +9,15 @@
 #include "LogGenerator/C2K/SystemIdentification.h"
 #include "LogGenerator/C2K/TrafficFER.h"
 
+#include <algorithm>
+#include <array>
+#include <cstddef>
+
 namespace velmora::C2K {
 
 namespace {
+
+constexpr std::size_t parserCount = 8;
 
 template <class Parser>
 const LogCodeParser* the() {
@@ -22,7 +28,7 @@ const LogCodeParser* the() {
 } // namespace
 
 std::span<const LogCodeParser* const> logCodeParsers() {
-    static const LogCodeParser* const parsers[] = {
+    static const std::array<const LogCodeParser*, parserCount> parsers = {
         the<FingerC2I>(),  the<EVDOStatus>(), the<ForwardLinkDataRate>(), the<ActiveSetPilots>(),
         the<OneXStatus>(), the<TrafficFER>(), the<ReverseLinkDataRate>(), the<SystemIdentification>(),
     };
@@ -30,10 +36,15 @@ std::span<const LogCodeParser* const> logCodeParsers() {
 }
 
 const LogCodeParser* parserOfCode(std::uint32_t logCode) {
-    for (const LogCodeParser* parser : logCodeParsers())
-        if (parser->logCode() == logCode)
-            return parser;
-    return nullptr;
+    // Asked for every message.
+    static const auto codes = [] {
+        std::array<std::uint32_t, parserCount> result{};
+        std::transform(logCodeParsers().begin(), logCodeParsers().end(), result.begin(),
+                       [](const LogCodeParser* parser) { return parser->logCode(); });
+        return result;
+    }();
+    const auto found = std::find(codes.begin(), codes.end(), logCode);
+    return found == codes.end() ? nullptr : logCodeParsers()[static_cast<std::size_t>(found - codes.begin())];
 }
 
 } // namespace velmora::C2K

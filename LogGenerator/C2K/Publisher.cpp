@@ -34,27 +34,14 @@ Value textOf(Bytes bytes, const void*) {
 
 } // namespace
 
-template <class Show>
-void Publisher::forEachTarget(std::string_view valueKey, Show show) const {
-    const Value* found = _lookup ? _lookup->find(valueKey) : nullptr;
-    const Array* targets = found ? found->asArray() : nullptr;
-    if (!targets)
-        return;
-    for (const Value& target : *targets) {
-        const Dictionary* fields = target.asDictionary();
-        const std::string* label = fields ? (*fields)["key"].asString() : nullptr;
-        Dictionary* display = fields ? (*fields)["dict"].asDictionary() : nullptr;
-        if (!label || !display || display->isFrozen())
-            return;
-        show(*display, *label);
-    }
-}
-
-void Publisher::publish(std::string_view valueKey, const Value& value) const {
+void Publisher::tell(std::string_view valueKey, const Value& value) const {
     if (_effects)
         _effects->value(valueKey, value);
-    forEachTarget(valueKey,
-                  [&value](Dictionary& display, const std::string& label) { display.set(label, value); });
+}
+
+void Publisher::show(std::string_view valueKey, const Value& value) const {
+    for (const auto& [display, label] : _targets.of(valueKey))
+        display->set(*label, value);
 }
 
 void Publisher::publishText(std::string_view valueKey, std::string_view text) const {
@@ -66,20 +53,20 @@ void Publisher::publishLater(std::string_view valueKey, MakeValue make, const vo
                              Bytes bytes) const {
     if (_effects)
         _effects->value(valueKey, make(bytes, table));
-    forEachTarget(valueKey, [&](Dictionary& display, const std::string& label) {
-        const LateValue late{make, table, label.size()};
-        const std::size_t length = sizeof late + label.size() + bytes.size();
+    for (const auto& [display, label] : _targets.of(valueKey)) {
+        const LateValue late{make, table, label->size()};
+        const std::size_t length = sizeof late + label->size() + bytes.size();
         if (length > longestLate) {
-            display.set(label, make(bytes, table));
-            return;
+            display->set(*label, make(bytes, table));
+            continue;
         }
         std::array<std::uint8_t, longestLate> buffer;
         std::memcpy(buffer.data(), &late, sizeof late);
-        const auto behind = std::copy(label.begin(), label.end(), buffer.begin() + sizeof late);
+        const auto behind = std::copy(label->begin(), label->end(), buffer.begin() + sizeof late);
         std::copy(bytes.begin(), bytes.end(), behind);
         // The label's place in memory stands for the label: display and lookup are made and go together.
-        display.writeLater({writeLateValue, &label}, Bytes(buffer).first(length));
-    });
+        display->writeLater({writeLateValue, label}, Bytes(buffer).first(length));
+    }
 }
 
 } // namespace velmora::C2K

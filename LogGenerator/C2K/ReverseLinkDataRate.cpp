@@ -35,13 +35,20 @@ constexpr DataRateKeys keys = {
     .sent2 = "RLDataSent2",
 };
 
+/// The sum of the counters that stand from there on.
+std::uint64_t sum(const Record& counters) {
+    std::uint64_t count = 0;
+    for (std::size_t i = 0; i < countersInGroup; ++i)
+        count += counters.u32(4 * i);
+    return count;
+}
+
 /// How many packets of that size have been sent.
 std::uint64_t packets(const Record& record, std::size_t size) {
     std::uint64_t count = 0;
     for (std::size_t block = 0; block < blocks; ++block)
         for (const std::size_t group : groupsAt)
-            for (std::size_t i = 0; i < countersInGroup; ++i)
-                count += record.u32(group + sizeStride * size + blockStride * block + 4 * i);
+            count += sum(record.part(group + sizeStride * size + blockStride * block, 4 * countersInGroup));
     return count;
 }
 

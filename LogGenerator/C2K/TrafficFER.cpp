@@ -4,12 +4,22 @@
 #include "LogGenerator/C2K/SubPackets.h"
 #include "Platform/SystemLog.h"
 
+#include <array>
+#include <cstring>
+
 namespace velmora::C2K {
 
 namespace {
 
 constexpr std::uint8_t trafficDemodulation = 11;
 constexpr std::size_t erasureAt = 24; // in the sub-packet
+
+/// Of the average.
+Value percentOf(Bytes bytes, const void*) {
+    float average = 0;
+    std::memcpy(&average, bytes.data(), sizeof average);
+    return FrameErrorAverage::percent(average);
+}
 
 } // namespace
 
@@ -29,7 +39,9 @@ void TrafficFER::parse(const Record& record, Dictionary& state, const Publisher&
         return;
     const bool erased = subPackets.from(demodulation).u8(erasureAt) != 0;
     const float average = FrameErrorAverage(state).add(erased);
-    publisher.publish("k1xTrafficFER", FrameErrorAverage::percent(average));
+    std::array<std::uint8_t, sizeof average> bytes;
+    std::memcpy(bytes.data(), &average, sizeof average);
+    publisher.publishLater("k1xTrafficFER", percentOf, nullptr, bytes);
 }
 
 } // namespace velmora::C2K

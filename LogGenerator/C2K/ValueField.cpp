@@ -1,5 +1,7 @@
 #include "LogGenerator/C2K/ValueField.h"
 
+#include "LogGenerator/C2K/Publisher.h"
+
 #include <array>
 #include <cstdio>
 #include <cstring>
@@ -8,11 +10,7 @@ namespace velmora::C2K {
 
 namespace {
 
-/// `table`: the field; `bytes`: its raw value.
-Value shownValue(Bytes bytes, const void* table) {
-    const auto& field = *static_cast<const ValueField*>(table);
-    std::int64_t raw = 0;
-    std::memcpy(&raw, bytes.data(), sizeof raw);
+Value shownValue(const ValueField& field, std::int64_t raw) {
     switch (field.shown.kind) {
     case Shown::Kind::Texts: return (*field.shown.texts)[static_cast<std::uint32_t>(raw)];
     case Shown::Kind::Hexadecimal: {
@@ -27,19 +25,54 @@ Value shownValue(Bytes bytes, const void* table) {
     return node[field.key];
 }
 
+Value shownValue(const ValueField& field, const Record& record, bool connected) {
+    const bool means = connected || field.when == When::Always;
+    return means ? shownValue(field, field.where.read(record)) : Value("N/A");
+}
+
+/// What a display keeps until it is looked at: this, the labelled fields, and the record as far as it is
+/// needed.
+struct LateFields {
+    std::size_t labelsLength = 0;
+    bool connected = false;
+};
+
+/// Of a longer one the fields are published one by one.
+constexpr std::size_t longestRecord = 256;
+
+/// `table`: the first of the fields.
+void writeLateFields(Dictionary& display, Bytes bytes, const void* table) {
+    LateFields late;
+    std::memcpy(&late, bytes.data(), sizeof late);
+    const Record record(bytes.subspan(sizeof late + late.labelsLength));
+    for (LabelledFields labels(bytes.subspan(sizeof late, late.labelsLength)); !labels.atEnd();) {
+        const auto [place, label] = labels.next();
+        display.set(label, shownValue(static_cast<const ValueField*>(table)[place], record, late.connected));
+    }
+}
+
 } // namespace
 
 void publishFields(const Publisher& publisher, const Record& record, std::span<const ValueField> fields,
                    bool connected) {
-    for (const ValueField& field : fields) {
-        if (!connected && field.when != When::Always) {
-            publisher.publish(field.key, "N/A");
-            continue;
-        }
-        const std::int64_t raw = field.where.read(record);
-        std::array<std::uint8_t, sizeof raw> bytes;
-        std::memcpy(bytes.data(), &raw, sizeof raw);
-        publisher.publishLater(field.key, shownValue, &field, bytes);
+    if (publisher.tells())
+        for (const ValueField& field : fields)
+            publisher.tell(field.key, shownValue(field, record, connected));
+    const Bytes needed = record.bytes().first(endOf(fields, connected));
+    const Targets::Screens& screens = publisher.targets().of(fields);
+    if (!screens || needed.size() > longestRecord) {
+        for (const ValueField& field : fields)
+            publisher.show(field.key, shownValue(field, record, connected));
+        return;
+    }
+    for (const auto& [display, labels] : *screens) {
+        const LateFields late{labels.size(), connected};
+        std::array<std::uint8_t, sizeof late + LabelledFields::longest + longestRecord> buffer;
+        std::memcpy(buffer.data(), &late, sizeof late);
+        const auto behind = std::copy(labels.begin(), labels.end(), buffer.begin() + sizeof late);
+        const auto end = std::copy(needed.begin(), needed.end(), behind);
+        display->writeLater({writeLateFields, fields.data()},
+                            Bytes(buffer).first(static_cast<std::size_t>(end - buffer.begin())));
     }
 }
 

@@ -1,7 +1,6 @@
 #pragma once
 
 #include "LogGenerator/C2K/NumberedTexts.h"
-#include "LogGenerator/C2K/Publisher.h"
 #include "LogGenerator/Field.h"
 
 #include <algorithm>
@@ -11,6 +10,8 @@
 #include <string_view>
 
 namespace velmora::C2K {
+
+class Publisher;
 
 /// How a field's raw value becomes text: as the sections' fields do, by a table that shows unknown values, or
 /// as six hexadecimal digits.

@@ -62,7 +62,8 @@ void GSMLogGenerator::updateState(Dictionary& state, const Data& data) {
 }
 
 Value GSMLogGenerator::generateLogUsingState(Dictionary& state) {
-    updateHistoryInState(state, clock());
+    if (keepsHistory())
+        updateHistoryInState(state, clock());
     return state["Display"];
 }
 

@@ -15,10 +15,11 @@ void IntraFrequencyList::updateWithData(const Data& data, std::uint32_t logCode)
     const Record record(data);
     if (record.size() < IntraFrequencyRecord::minimumLength)
         return;
-    clearElements();
     const IntraFrequencyRecord measurement(record);
     if (const CountedList& cells = (measurement.*_cells)(); cells.count() > 0)
         showRows(cells, _cell, logCode);
+    else
+        clearElements();
 }
 
 } // namespace velmora

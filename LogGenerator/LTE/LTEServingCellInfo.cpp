@@ -67,8 +67,8 @@ void LTEServingCellInfo::showCell(const Record& record) {
     if (!show(record, carrier))
         return;
     // The telephony service's name for the downlink frequency goes when the baseband's arrives.
-    if (const DictionaryRef node = dictionary())
-        node->remove("UARFCN");
+    if (Dictionary* const node = dictionary())
+        node->removeLater("UARFCN");
     show(record, identity);
 }
 
@@ -78,7 +78,7 @@ void LTEServingCellInfo::showServingCell(const Data& data) {
         return;
     if (const Cell* serving =
             firstCell(*cells, {kVoxCellMonitorRadioAccessTechnologyLTE, kVoxCellMonitorCellTypeServing}))
-        writeCellFields(dictionary().get(), *serving, servingCellFields);
+        writeCellFields(dictionary(), *serving, servingCellFields);
 }
 
 } // namespace velmora

@@ -57,7 +57,7 @@ void GSMServingCell::showServingCell(const Data& data) {
         return;
     if (const Cell* cell =
             firstCell(*cells, {kVoxCellMonitorRadioAccessTechnologyGSM, kVoxCellMonitorCellTypeServing}))
-        writeCellFields(dictionary().get(), *cell, cellFields);
+        writeCellFields(dictionary(), *cell, cellFields);
 }
 
 } // namespace velmora

@@ -90,7 +90,7 @@ void ServingPLMN::showServingCell(const Data& data) {
     for (const Cell& cell : *cells) {
         if (!isServingCell(cell))
             continue;
-        writeCellFields(dictionary().get(), cell, cellFields);
+        writeCellFields(dictionary(), cell, cellFields);
         return; // only the first serving cell counts
     }
 }

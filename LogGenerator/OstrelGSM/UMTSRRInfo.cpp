@@ -97,8 +97,8 @@ void UMTSRRInfo::showCell(const Record& record) {
     if (!show(record, cell))
         return;
     // The telephony service's name for the downlink frequency goes when the baseband's arrives.
-    if (const DictionaryRef node = dictionary())
-        node->remove("UARFCN");
+    if (Dictionary* const node = dictionary())
+        node->removeLater("UARFCN");
 }
 
 void UMTSRRInfo::showServingCell(const Data& data) {
@@ -107,7 +107,7 @@ void UMTSRRInfo::showServingCell(const Data& data) {
         return;
     if (const Cell* serving =
             firstCell(*cells, {kVoxCellMonitorRadioAccessTechnologyUMTS, kVoxCellMonitorCellTypeServing}))
-        writeCellFields(dictionary().get(), *serving, servingCellFields);
+        writeCellFields(dictionary(), *serving, servingCellFields);
 }
 
 } // namespace velmora

@@ -63,7 +63,7 @@ void UMTSSet::showKnownCells(const Data& data) {
     const std::vector<Cell>* cells = cellsOf(data);
     if (!cells)
         return;
-    writeCellRows(array().get(), *cells, known, _knownCells);
+    writeCellRows(array(), *cells, known, _knownCells);
 }
 
 } // namespace velmora

@@ -66,9 +66,8 @@ void RRC_State::updateWithData(const Data& data, std::uint32_t logCode) {
     const std::string_view state = states[static_cast<std::uint32_t>(current)];
     setText("State", state);
     if (systemLogWants(LogPriority::Warning))
-        logFormat(LogPriority::Warning, "Display Dict = %s, rrc mode = %d %s",
-                  description(Value(dictionary())).c_str(), static_cast<int>(current),
-                  std::string(state).c_str());
+        logFormat(LogPriority::Warning, "Display Dict = %s, rrc mode = %d %s", description(node()).c_str(),
+                  static_cast<int>(current), std::string(state).c_str());
 }
 
 } // namespace velmora

@@ -50,10 +50,10 @@ void UTRANServingCellInfo::showServingCells(const Data& data) const {
     if (!cells)
         return;
     constexpr CellKind serving(kVoxCellMonitorRadioAccessTechnologyUTRAN, kVoxCellMonitorCellTypeServing);
-    const DictionaryRef node = dictionary();
+    Dictionary* const node = dictionary();
     for (const Cell& cell : *cells)
         if (cell.kind == serving)
-            writeCellFields(node.get(), cell, knownFields);
+            writeCellFields(node, cell, knownFields);
 }
 
 } // namespace velmora

@@ -65,7 +65,7 @@ protected:
     };
 
     struct Observer final : DecodingObserver {
-        void messageDecoded(const LoggedMessage&, const Value&) override { ++messages; }
+        void messageDecoded(const LoggedMessage&, const Dictionary&) override { ++messages; }
         void refreshed(Time tick, const Decoded& decoded) override {
             const Dictionary* section = (*decoded.display.asDictionary())["GSM RR Info"].asDictionary();
             refreshes.push_back({tick, *(*section)["RR State"].asString()});
@@ -117,6 +117,29 @@ TEST_F(DecodingTest, RefreshesAtTheTicksThatHaveHadMessages) {
                 ElementsAre(Refresh{at(2000), "RR_IDLE"}, Refresh{at(4000), "RR_INACTIVE"},
                             Refresh{at(10'000), "RR_GOING_ACTIVE"},
                             Refresh{at(12'000), "RR_GOING_INACTIVE"}));
+}
+
+TEST_F(DecodingTest, KeepsTheHistoryForThoseWhoWantIt) {
+    struct Ended final : DecodingObserver {
+        explicit Ended(bool wanted) : wantsIt(wanted) {}
+        [[nodiscard]] bool wantsHistory() const override { return wantsIt; }
+        void ended(const LogGenerator&, const Dictionary& state) override {
+            const Array* history = state["History"].asArray();
+            entries = history ? history->size() : 0;
+            hasRawMessages = state.contains("DisplayState");
+        }
+        bool wantsIt;
+        bool hasRawMessages = false;
+        std::size_t entries = 0;
+    };
+    for (const bool wanted : {false, true}) {
+        ListReader reader("Ostrel_GSM", {{at(0), rrState(4)}, {at(2500), rrState(5)}});
+        WorkContext context("test");
+        Ended observer(wanted);
+        ASSERT_TRUE(decodeMessages(reader, {}, context, observer));
+        EXPECT_EQ(observer.entries, wanted ? 2u : 0u);
+        EXPECT_EQ(observer.hasRawMessages, wanted);
+    }
 }
 
 TEST_F(DecodingTest, OneMessageIsShownByTheLastTick) {

@@ -391,5 +391,40 @@ TEST(C2KProcessTemplateTest, EmptyTemplateSaysSoToo) {
     EXPECT_TRUE(lookup.empty());
 }
 
+TEST_F(C2KLogGeneratorTest, ShowsEachStateOnItsOwnDisplay) {
+    // One after the other in the same place in memory, with other labels each time.
+    for (int i = 0; i < 20; ++i) {
+        const std::string label = "Fingers " + std::to_string(i);
+        resources.put("C2KTemplate", "plist", dictionary({{label, "kFingerC2I"}}));
+        Dictionary first;
+        Dictionary second;
+        generator->updateState(first, noFingers());
+        generator->updateState(second, noFingers());
+        generator->updateState(first, noFingers());
+        EXPECT_EQ(shown(first["Display"]), "{" + label + " '(none)'}");
+        EXPECT_EQ(shown(second["Display"]), "{" + label + " '(none)'}");
+    }
+}
+
+TEST_F(C2KLogGeneratorTest, LabelsOfAnyLengthShowTheirFields) {
+    for (const std::size_t length : {255u, 256u, 2000u}) {
+        const std::string label(length, 'L');
+        resources.put("C2KTemplate", "plist", dictionary({{label, "kColorCode"}, {"Channel", "kChannel"}}));
+        Dictionary itsState;
+        // EV-DO status: 50 bytes, all zero behind the header.
+        generator->updateState(itsState, recordWith(0x1183, 50));
+        generator->updateState(itsState, recordWith(0x1183, 50));
+        EXPECT_EQ(shown(itsState["Display"]), "{" + label + " '0', Channel '0'}") << length;
+    }
+}
+
+TEST_F(C2KLogGeneratorTest, WithoutAHistoryOnlyTheDisplayIsKept) {
+    generator->setKeepsHistory(false);
+    update(noFingers());
+    EXPECT_EQ(shown(generator->generateLogUsingState(state)), fingersShown);
+    EXPECT_FALSE(state.contains("History"));
+    EXPECT_FALSE(state.contains("DisplayState"));
+}
+
 } // namespace
 } // namespace velmora

@@ -54,8 +54,9 @@ ParserHarness::ParserHarness() {
         const DictionaryRef target = makeDictionary();
         target->set("key", key);
         target->set("dict", _display);
-        _lookup.set(key, std::make_shared<Array>(Array{target}));
+        _lookup->set(key, std::make_shared<Array>(Array{target}));
     }
+    _targets.use(_lookup);
 }
 
 ParserHarness& ParserHarness::update(const Data& record) {
@@ -64,7 +65,7 @@ ParserHarness& ParserHarness::update(const Data& record) {
     const C2K::LogCodeParser* parser = C2K::parserOfCode(header.u16(3));
     if (!parser)
         throw std::invalid_argument("a record that no parser takes");
-    parser->parse(header, state, C2K::Publisher(&_lookup));
+    parser->parse(header, state, C2K::Publisher(_targets));
     _lines = log.lines();
     return *this;
 }

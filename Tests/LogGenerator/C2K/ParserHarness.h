@@ -51,7 +51,8 @@ public:
 
 private:
     DictionaryRef _display = makeDictionary();
-    Dictionary _lookup;
+    DictionaryRef _lookup = makeDictionary();
+    C2K::Targets _targets;
     LogLines _lines;
 };
 

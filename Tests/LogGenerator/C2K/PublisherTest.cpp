@@ -16,14 +16,20 @@ class PublisherTest : public testing::Test {
 protected:
     /// Publishes "new" for "kA" to these targets; what `screen` then shows.
     std::string publishTo(std::initializer_list<Value> targets) {
-        lookup.set("kA", std::make_shared<Array>(Array(targets)));
-        C2K::Publisher(&lookup).publish("kA", "new");
+        lookup->set("kA", std::make_shared<Array>(Array(targets)));
+        publish("kA", "new");
         return shown(screen);
+    }
+
+    void publish(std::string_view valueKey, const auto& value) {
+        C2K::Targets targets;
+        targets.use(lookup);
+        C2K::Publisher(targets).publish(valueKey, value);
     }
 
     DictionaryRef screen = makeDictionary();
     DictionaryRef other = makeDictionary();
-    Dictionary lookup;
+    DictionaryRef lookup = makeDictionary();
 };
 
 TEST_F(PublisherTest, WritesEveryTarget) {
@@ -33,10 +39,11 @@ TEST_F(PublisherTest, WritesEveryTarget) {
 }
 
 TEST_F(PublisherTest, AKeyWithoutAnArrayIsNotShown) {
-    C2K::Publisher(nullptr).publish("kA", "new");
-    C2K::Publisher(&lookup).publish("kA", "new");
-    lookup.set("kA", target("One", screen));
-    C2K::Publisher(&lookup).publish("kA", "new");
+    publish("kA", "new");
+    lookup->set("kA", target("One", screen));
+    publish("kA", "new");
+    lookup = nullptr;
+    publish("kA", "new");
     EXPECT_EQ(shown(screen), "{}");
 }
 
@@ -56,18 +63,20 @@ TEST_F(PublisherTest, TheFirstOddTargetEndsIt) {
 }
 
 TEST_F(PublisherTest, AnOddTargetEndsNoOtherKey) {
-    lookup.set("kB", std::make_shared<Array>(Array{target("B", screen)}));
+    lookup->set("kB", std::make_shared<Array>(Array{target("B", screen)}));
     publishTo({"text"});
-    C2K::Publisher(&lookup).publish("kB", NumberText("%+.2f dB", 1.0));
+    publish("kB", NumberText("%+.2f dB", 1.0));
     EXPECT_EQ(shown(screen), "{B '+1.00 dB'}");
 }
 
 TEST_F(PublisherTest, EffectsAreToldOfEveryValueShownOrNot) {
     const std::vector<std::pair<std::string, Value>> told = {
         {"kA", Value(7)}, {"kA", Value("new")}, {"kB", Value("+1.00 dB")}};
-    lookup.set("kA", std::make_shared<Array>(Array{target("One", screen)}));
+    lookup->set("kA", std::make_shared<Array>(Array{target("One", screen)}));
     NotedEffects effects;
-    const C2K::Publisher publisher(&lookup, &effects);
+    C2K::Targets targets;
+    targets.use(lookup);
+    const C2K::Publisher publisher(targets, &effects);
     publisher.publish("kA", Value(7));
     EXPECT_EQ((*screen)["One"], Value(7));
     publisher.publish("kA", "new");
