@@ -17,29 +17,20 @@ std::int64_t Where::read(const Record& record) const {
 }
 
 void writeValue(Dictionary& node, std::string_view label, const Show& show, std::int64_t raw) {
-    if (show.hasException && raw == show.exception) {
-        node.setText(label, show.exceptionText);
-        return;
-    }
-    switch (show.kind) {
-    case Show::Kind::Integer: {
-        const auto value =
-            raw * static_cast<std::int64_t>(show.scale) + static_cast<std::int64_t>(show.offset);
-        node.setText(label, NumberText(show.format, value).text());
-        break;
-    }
-    case Show::Kind::Real:
-        node.setText(label,
-                     NumberText(show.format, static_cast<double>(raw) * show.scale + show.offset).text());
-        break;
-    case Show::Kind::Text: node.setText(label, (*show.texts)[static_cast<std::uint32_t>(raw)]); break;
-    case Show::Kind::Flag: node.setText(label, raw != 0 ? show.set : show.clear); break;
-    }
+    withText(show, raw, [&node, label](std::string_view text) { node.setText(label, text); });
 }
 
 void writeFields(Dictionary& node, const Record& record, const Layout& layout) {
+    if (!node.empty()) {
+        for (const Field& field : layout.fields)
+            writeValue(node, field.label, field.show, field.where.read(record));
+        return;
+    }
+    // A row's labels are all new, and no two of a layout's are the same.
+    node.reserve(layout.fields.size());
     for (const Field& field : layout.fields)
-        writeValue(node, field.label, field.show, field.where.read(record));
+        withText(field.show, field.where.read(record),
+                 [&](std::string_view text) { node.addText(field.label, text); });
 }
 
 void writeFieldsLater(Dictionary& node, const Record& record, const Layout& layout) {

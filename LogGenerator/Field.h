@@ -154,13 +154,40 @@ struct Layout {
     std::span<const Field> fields;
 };
 
-/// A layout whose fields all lie inside the minimum length; any other does not compile.
+/// A layout whose fields all lie inside the minimum length under labels of their own; any other does not
+/// compile.
 template <std::size_t N>
 consteval Layout layout(std::size_t minimumLength, const Field (&fields)[N]) {
-    for (const Field& field : fields)
-        if (field.where.end() > minimumLength)
+    for (std::size_t i = 0; i < N; ++i) {
+        if (fields[i].where.end() > minimumLength)
             throw "a field that ends behind the minimum length";
+        for (std::size_t j = 0; j < i; ++j)
+            if (fields[j].label == fields[i].label)
+                throw "two fields of one label";
+    }
     return {minimumLength, fields};
+}
+
+/// Calls `put(text)` with what a raw value reads.
+template <class Put>
+void withText(const Show& show, std::int64_t raw, Put put) {
+    if (show.hasException && raw == show.exception) {
+        put(show.exceptionText);
+        return;
+    }
+    switch (show.kind) {
+    case Show::Kind::Integer: {
+        const auto value =
+            raw * static_cast<std::int64_t>(show.scale) + static_cast<std::int64_t>(show.offset);
+        put(NumberText(show.format, value).text());
+        break;
+    }
+    case Show::Kind::Real:
+        put(NumberText(show.format, static_cast<double>(raw) * show.scale + show.offset).text());
+        break;
+    case Show::Kind::Text: put((*show.texts)[static_cast<std::uint32_t>(raw)]); break;
+    case Show::Kind::Flag: put(raw != 0 ? show.set : show.clear); break;
+    }
 }
 
 /// Writes one raw value under its label.

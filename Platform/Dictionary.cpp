@@ -67,13 +67,24 @@ Value& Dictionary::slot(std::string_view key) {
     static_cast<void>(written());
     if (const std::size_t index = indexOf(key); index != nowhere)
         return _entries[index].value;
-    _entries.push_back({std::string(key), Value()});
+    return add(key, Value());
+}
+
+Value& Dictionary::add(std::string_view key, Value value) {
+    _entries.push_back({std::string(key), std::move(value)});
     _keysChanged = ++_changes;
     if (!_index.empty())
         _index.emplace(key, _entries.size() - 1);
     else if (_entries.size() >= indexedFrom)
         rebuildIndex();
     return _entries.back().value;
+}
+
+void Dictionary::addText(std::string_view key, std::string_view text) {
+    expectMutable();
+    static_cast<void>(written());
+    add(key, text);
+    _entriesChanged = ++_changes;
 }
 
 void Dictionary::set(std::string_view key, Value value) {

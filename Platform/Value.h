@@ -169,6 +169,9 @@ public:
     void set(std::string_view key, Value value);
     /// `set` with a string, without giving up the storage of one that is there already.
     void setText(std::string_view key, std::string_view text);
+    /// `setText` without looking for the key. Precondition: there is no such key yet.
+    void addText(std::string_view key, std::string_view text);
+    void reserve(std::size_t count) { _entries.reserve(count); }
     /// Whether there was such a key.
     bool remove(std::string_view key);
     /// Has the bytes written, as all that is set before and after would have it, when somebody looks for
@@ -205,6 +208,7 @@ private:
     /// The key's place in `_entries`, or nowhere.
     [[nodiscard]] std::size_t indexOf(std::string_view key) const;
     Value& slot(std::string_view key);
+    Value& add(std::string_view key, Value value);
     void erase(std::size_t index);
     /// What `removeLater` has done later: the bytes are the key.
     static void eraseKey(Dictionary& dictionary, Bytes key, const void*);

@@ -20,9 +20,9 @@ Value shownValue(const ValueField& field, std::int64_t raw) {
     }
     case Shown::Kind::Plain: break;
     }
-    Dictionary node;
-    writeValue(node, field.key, field.shown.show, raw);
-    return node[field.key];
+    Value value;
+    withText(field.shown.show, raw, [&value](std::string_view text) { value = text; });
+    return value;
 }
 
 Value shownValue(const ValueField& field, const Record& record, bool connected) {

@@ -163,5 +163,37 @@ TEST(Data, PartsShareTheBuffer) {
     EXPECT_NE(Data::copyOf(part.bytes()).bytes().data(), part.bytes().data());
 }
 
+TEST(Dictionary, TextsOfNewKeysAreFoundHoweverManyThereAre) {
+    Dictionary dictionary;
+    dictionary.reserve(40);
+    for (int i = 0; i < 40; ++i) {
+        dictionary.addText("key " + std::to_string(i), std::to_string(i));
+        EXPECT_EQ(dictionary["key 0"], Value("0"));
+        EXPECT_EQ(dictionary["key " + std::to_string(i)], Value(std::to_string(i)));
+    }
+    EXPECT_EQ(dictionary.size(), 40u);
+    EXPECT_FALSE(dictionary.contains("key 40"));
+    dictionary.setText("key 7", "seven");
+    EXPECT_EQ(dictionary["key 7"], Value("seven"));
+    EXPECT_EQ(dictionary.size(), 40u);
+    const Value copy = Value(std::make_shared<Dictionary>(dictionary)).copy();
+    EXPECT_THROW(copy.asDictionary()->addText("key 40", ""), std::logic_error);
+}
+
+TEST(Dictionary, AKeyIsFoundByItsTextWhereverThatStandsInMemory) {
+    Dictionary dictionary{{"A", 1}, {"B", 2}, {"", 3}};
+    std::string key = "A"; // the same place in memory with another text each time
+    for (const auto& [text, wanted] : {std::pair("A", 1), {"B", 2}, {"C", 0}, {"", 3}, {"A", 1}}) {
+        key = text;
+        const Value* found = dictionary.find(key);
+        EXPECT_EQ(found ? *found : Value(0), Value(wanted)) << text;
+    }
+    dictionary.remove("A");
+    key = "B";
+    EXPECT_EQ(dictionary[key], Value(2));
+    key = "A";
+    EXPECT_EQ(dictionary.find(key), nullptr);
+}
+
 } // namespace
 } // namespace velmora
