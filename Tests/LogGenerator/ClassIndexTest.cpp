@@ -59,6 +59,14 @@ TEST(ClassIndexTest, NobodyWantsAnotherCodeHoweverFewThereAre) {
         EXPECT_THAT(one.getSubscribers(code), IsNull());
 }
 
+TEST(ClassIndexTest, CodesThatComeLaterAreRouted) {
+    SingleIndex index;
+    EXPECT_THAT(index.getSubscribers(0x1234), IsNull());
+    index.codeDictionary["4660"].push_back(index.sim.get());
+    EXPECT_THAT(index.getSubscribers(0x1234), Pointee(ElementsAre(index.sim.get())));
+    EXPECT_THAT(index.getSubscribers(0xFF0000), Pointee(ElementsAre(index.sim.get())));
+}
+
 TEST(ClassIndexTest, ListsEveryCodeAsADecimalString) {
     EXPECT_THAT(SmallIndex().getAllLogCodes(),
                 UnorderedElementsAre("16711680", "16711682", "28977", "28978"));

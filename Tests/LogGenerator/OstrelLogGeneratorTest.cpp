@@ -43,6 +43,16 @@ protected:
     Dictionary state = {{"History", history}};
 };
 
+TEST_F(DLFTest, RawMaterialWithoutAMessageAddsNothing) {
+    const Data empty = dlf();
+    addToHistory(Data());
+    EXPECT_EQ(dlf(), empty);
+    addToHistory(hex("01")); // a type byte alone
+    EXPECT_EQ(dlf(), empty);
+    addToHistory(hex("01 0C"));
+    EXPECT_EQ(dlf(), joined(empty, hex("0C")));
+}
+
 TEST_F(DLFTest, EmptyHistoryIsTheVersionReportAlone) {
     clock.setZone({-5h - 30min, false});
     const Data expected =

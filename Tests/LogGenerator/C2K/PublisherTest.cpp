@@ -69,6 +69,18 @@ TEST_F(PublisherTest, AnOddTargetEndsNoOtherKey) {
     EXPECT_EQ(shown(screen), "{B '+1.00 dB'}");
 }
 
+TEST_F(PublisherTest, AKeyIsFoundByItsTextWhereverThatStandsInMemory) {
+    lookup->set("kA", std::make_shared<Array>(Array{target("One", screen)}));
+    lookup->set("kB", std::make_shared<Array>(Array{target("Two", screen)}));
+    C2K::Targets targets;
+    targets.use(lookup);
+    std::string key = "kA";
+    C2K::Publisher(targets).publish(key, "a");
+    key.back() = 'B';
+    C2K::Publisher(targets).publish(key, "b");
+    EXPECT_EQ(shown(screen), "{One 'a', Two 'b'}");
+}
+
 TEST_F(PublisherTest, EffectsAreToldOfEveryValueShownOrNot) {
     const std::vector<std::pair<std::string, Value>> told = {
         {"kA", Value(7)}, {"kA", Value("new")}, {"kB", Value("+1.00 dB")}};
