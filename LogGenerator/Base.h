@@ -144,7 +144,7 @@ private:
     /// A node that the display owns. On the one thread there is, nothing takes it away while a record is
     /// decoded, so that it is looked at without a share in it, which would cost more than to write there.
     template <class Node>
-    class NodeRef {
+    class WatchedNode {
     public:
         void refer(const std::shared_ptr<Node>& node) {
             _watch = node;
@@ -159,8 +159,8 @@ private:
     };
 
     /// `sectionRef`: the one of the two that fits the node's kind.
-    NodeRef<Dictionary> _dictionaryRef;
-    NodeRef<Array> _arrayRef;
+    WatchedNode<Dictionary> _dictionaryRef;
+    WatchedNode<Array> _arrayRef;
     std::shared_ptr<CellList> _cells = std::make_shared<CellList>();
 };
 
