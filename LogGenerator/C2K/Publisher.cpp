@@ -44,7 +44,7 @@ void Publisher::show(std::string_view valueKey, const Value& value) const {
         display->set(*label, value);
 }
 
-void Publisher::publishText(std::string_view valueKey, std::string_view text) const {
+void Publisher::publish(std::string_view valueKey, std::string_view text) const {
     publishLater(valueKey, textOf, nullptr,
                  {reinterpret_cast<const std::uint8_t*>(text.data()), text.size()});
 }

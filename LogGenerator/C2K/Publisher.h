@@ -1,11 +1,9 @@
 #pragma once
 
 #include "LogGenerator/C2K/Targets.h"
-#include "LogGenerator/NumberFormat.h"
 #include "Platform/Bytes.h"
 #include "Platform/Value.h"
 
-#include <concepts>
 #include <string_view>
 
 namespace velmora {
@@ -22,32 +20,21 @@ public:
     explicit Publisher(Targets& targets, MessageEffects* effects = nullptr)
         : _targets(targets), _effects(effects) {}
 
-    /// Shows the value under every label of the key, in the lookup's order, and tells of it.
-    void publish(std::string_view valueKey, const Value& value) const {
-        tell(valueKey, value);
-        show(valueKey, value);
-    }
-    void publish(std::string_view valueKey, const std::convertible_to<std::string_view> auto& text) const {
-        publishText(valueKey, text);
-    }
-    void publish(std::string_view valueKey, const NumberText& number) const {
-        publish(valueKey, number.text());
-    }
+    /// Shows the text under every label of the key, in the lookup's order, and tells of it.
+    void publish(std::string_view valueKey, std::string_view text) const;
 
     /// Makes a value of some bytes by a table, which must be a constant.
     using MakeValue = Value (*)(Bytes bytes, const void* table);
     /// As `publish` of `make(bytes, table)`, which is made when somebody looks at the display (see Writing).
     void publishLater(std::string_view valueKey, MakeValue make, const void* table, Bytes bytes) const;
 
-    /// The two halves of `publish`, and whether there is somebody to be told.
+    /// The two halves of `publish`, for any value, and whether there is somebody to be told.
     void tell(std::string_view valueKey, const Value& value) const;
     void show(std::string_view valueKey, const Value& value) const;
     [[nodiscard]] bool tells() const { return _effects != nullptr; }
     [[nodiscard]] Targets& targets() const { return _targets; }
 
 private:
-    void publishText(std::string_view valueKey, std::string_view text) const;
-
     Targets& _targets;
     MessageEffects* _effects;
 };
