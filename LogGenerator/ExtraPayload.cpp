@@ -40,15 +40,8 @@ Result<Value> RememberedPayloads::read(const Data& record) {
     return payload;
 }
 
-LogCode_0xFF0000::SIMFileReader::SIMFileReader(const Data& record) {
-    take(readPayload(record));
-}
-
 LogCode_0xFF0000::SIMFileReader::SIMFileReader(const Data& record, RememberedPayloads& earlier) {
-    take(earlier.read(record));
-}
-
-void LogCode_0xFF0000::SIMFileReader::take(Result<Value> payload) {
+    Result<Value> payload = earlier.read(record);
     if (!payload) {
         logLine(LogPriority::Error, "SIM File dictionary data could not be constructed");
         throw UnknownDataException();
@@ -61,15 +54,8 @@ const Value* LogCode_0xFF0000::SIMFileReader::value(std::string_view key) const 
     return files ? files->find(key) : nullptr;
 }
 
-ContextListReader::ContextListReader(const Data& record) {
-    take(readPayload(record));
-}
-
 ContextListReader::ContextListReader(const Data& record, RememberedPayloads& earlier) {
-    take(earlier.read(record));
-}
-
-void ContextListReader::take(Result<Value> payload) {
+    Result<Value> payload = earlier.read(record);
     if (payload && payload->asArray())
         _contexts = *std::move(payload);
 }

@@ -46,14 +46,11 @@ public:
 class SIMFileReader {
 public:
     /// Logs and raises UnknownDataException when the payload cannot be read.
-    explicit SIMFileReader(const Data& record);
     SIMFileReader(const Data& record, RememberedPayloads& earlier);
     /// The value under `key`; null when there is none.
     [[nodiscard]] const Value* value(std::string_view key) const;
 
 private:
-    void take(Result<Value> payload);
-
     Value _files;
 };
 
@@ -62,13 +59,10 @@ private:
 /// The packet-data contexts: an array, or nothing where the payload is anything else or unreadable.
 class ContextListReader {
 public:
-    explicit ContextListReader(const Data& record);
     ContextListReader(const Data& record, RememberedPayloads& earlier);
     [[nodiscard]] const Array* contexts() const { return _contexts.asArray(); }
 
 private:
-    void take(Result<Value> payload);
-
     Value _contexts;
 };
 
