@@ -4,7 +4,9 @@
 
 #include <gtest/gtest.h>
 
+#include <array>
 #include <cmath>
+#include <cstdio>
 #include <limits>
 
 namespace velmora {
@@ -40,6 +42,36 @@ TEST(NumberFormatTest, ShowsRealsAsPrintfDoes) {
     // A tie in the written digits rounds by the value that the double holds: 0.125 to even, 2.675 is below.
     EXPECT_EQ(realText("%4.2f", 0.125), "0.12");
     EXPECT_EQ(realText("%4.2f", 2.675), "2.67");
+}
+
+TEST(NumberFormatTest, ShowsEveryPartOfAUnitAsPrintfDoes) {
+    const auto expectAsPrintf = [](double value) {
+        const auto printed = [value](const char* format) {
+            std::array<char, 400> text{};
+            std::snprintf(text.data(), text.size(), format, value);
+            return std::string(text.data());
+        };
+        EXPECT_EQ(realText("%.0f", value), printed("%.0f"));
+        EXPECT_EQ(realText("%.1f", value), printed("%.1f"));
+        EXPECT_EQ(realText("%.2f", value), printed("%.2f"));
+        EXPECT_EQ(realText("%f", value), printed("%f"));
+        EXPECT_EQ(realText("%.7f", value), printed("%.7f"));
+        EXPECT_EQ(realText("%+9.3f", value), printed("%+9.3f"));
+    };
+    // Halves of all that is written are among these, which go to the even digit.
+    for (int i = -4'096; i <= 4'096; ++i) {
+        expectAsPrintf(i / 16.0);
+        expectAsPrintf(i / 1'024.0);
+        expectAsPrintf(i / 65'536.0);
+        expectAsPrintf(i / 131'072.0); // every other one has a place too many for whole numbers
+        expectAsPrintf(i / 10.0);
+        expectAsPrintf(i * 16'384.0 + 0.5); // to beyond 2^24 on both sides
+    }
+    expectAsPrintf(-0.0);
+    expectAsPrintf(16'777'215.9999847412109375); // the last of whole numbers
+    expectAsPrintf(16'777'216.0);
+    expectAsPrintf(1e300);
+    expectAsPrintf(5e-324);
 }
 
 TEST(NumberFormatTest, ShowsWhatIsNoNumber) {
