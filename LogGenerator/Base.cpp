@@ -14,11 +14,8 @@ namespace {
 void appendRows(Array& elements, Bytes entries, const Layout& layout) {
     const CountedList list(Record(entries), 0, layout.minimumLength, entries.size() / layout.minimumLength);
     elements.reserve(list.count());
-    for (std::size_t i = 0; i < list.count(); ++i) {
-        DictionaryRef row = makeDictionary();
-        writeFields(*row, list[i], layout);
-        elements.append(std::move(row));
-    }
+    for (std::size_t i = 0; i < list.count(); ++i)
+        writeFields(elements.appendRow(), list[i], layout);
 }
 
 } // namespace

@@ -89,11 +89,8 @@ void writeCellRows(Array* node, const std::vector<Cell>& cells, const CellRows& 
         const auto fields = static_cast<const CellRows*>(constant)->fields;
         const std::size_t length = CellNumbers::lengthFor(fields);
         const CountedList entries(Record(bytes), 0, length, bytes.size() / length);
-        for (std::size_t i = 0; i < entries.count(); ++i) {
-            const DictionaryRef row = makeDictionary();
-            CellNumbers::write(*row, entries[i], fields);
-            rows.append(row);
-        }
+        for (std::size_t i = 0; i < entries.count(); ++i)
+            CellNumbers::write(rows.appendRow(), entries[i], fields);
     };
     buffer.clear();
     for (const Cell& cell : cells) {

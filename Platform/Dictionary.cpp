@@ -31,7 +31,7 @@ std::size_t Dictionary::indexOf(std::string_view key) const {
     const auto address = static_cast<std::uint64_t>(reinterpret_cast<std::uintptr_t>(key.data()));
     std::uint8_t& hint = _found[address * goldenRatio >> 60];
     static_assert(sizeof _found == 16);
-    if (hint < _entries.size() && _entries[hint].key == key)
+    if (hint < _count && _entries[hint].key == key)
         return hint;
     std::size_t index = 0;
     if (!_index.empty()) {
@@ -40,9 +40,9 @@ std::size_t Dictionary::indexOf(std::string_view key) const {
             return nowhere;
         index = found->second;
     } else {
-        while (index < _entries.size() && _entries[index].key != key)
+        while (index < _count && _entries[index].key != key)
             ++index;
-        if (index == _entries.size())
+        if (index == _count)
             return nowhere;
     }
     if (index <= std::numeric_limits<std::uint8_t>::max())
@@ -51,9 +51,9 @@ std::size_t Dictionary::indexOf(std::string_view key) const {
 }
 
 const Value* Dictionary::find(std::string_view key) const {
-    const std::vector<Entry>& entries = written();
+    static_cast<void>(written());
     const std::size_t index = indexOf(key);
-    return index != nowhere ? &entries[index].value : nullptr;
+    return index != nowhere ? &_entries[index].value : nullptr;
 }
 
 const Value& Dictionary::operator[](std::string_view key) const {
@@ -67,23 +67,28 @@ Value& Dictionary::slot(std::string_view key) {
     static_cast<void>(written());
     if (const std::size_t index = indexOf(key); index != nowhere)
         return _entries[index].value;
-    return add(key, Value());
+    return add(key);
 }
 
-Value& Dictionary::add(std::string_view key, Value value) {
-    _entries.push_back({std::string(key), std::move(value)});
+/// A new entry, whose value is yet to be set: it may be what `clear` has left.
+Value& Dictionary::add(std::string_view key) {
+    if (_count == _entries.size())
+        _entries.push_back({std::string(key), Value()});
+    else if (_entries[_count].key != key)
+        _entries[_count].key = key;
+    ++_count;
     _keysChanged = ++_changes;
     if (!_index.empty())
-        _index.emplace(key, _entries.size() - 1);
-    else if (_entries.size() >= indexedFrom)
+        _index.emplace(key, _count - 1);
+    else if (_count >= indexedFrom)
         rebuildIndex();
-    return _entries.back().value;
+    return _entries[_count - 1].value;
 }
 
 void Dictionary::addText(std::string_view key, std::string_view text) {
     expectMutable();
     static_cast<void>(written());
-    add(key, text);
+    add(key).setText(text);
     _entriesChanged = ++_changes;
 }
 
@@ -113,8 +118,21 @@ bool Dictionary::remove(std::string_view key) {
     return true;
 }
 
+void Dictionary::clear() {
+    expectMutable();
+    for (Later& later : _later) {
+        later.turn = 0;
+        later.hasKeys = false;
+    }
+    _due = false;
+    _count = 0;
+    _index.clear();
+    _keysChanged = _entriesChanged = ++_changes;
+}
+
 void Dictionary::erase(std::size_t index) {
     _entries.erase(_entries.begin() + static_cast<std::ptrdiff_t>(index));
+    --_count;
     rebuildIndex();
     _keysChanged = _entriesChanged = ++_changes;
 }
@@ -177,7 +195,7 @@ void Dictionary::writeNow() const {
             next->turn = 0;
         }
         if (frozen)
-            for (Entry& entry : self._entries)
+            for (Entry& entry : self.entries())
                 if (entry.value.isNode())
                     entry.value = entry.value.copy();
     } catch (...) {
@@ -200,8 +218,8 @@ DictionaryRef Dictionary::frozenCopy() const {
 
 /// As for an array.
 bool Dictionary::isCopy(const Dictionary& copy) const {
-    return !_holdsNodes || std::equal(_entries.begin(), _entries.end(), copy._entries.begin(),
-                                      copy._entries.end(), [](const Entry& entry, const Entry& other) {
+    return !_holdsNodes || std::equal(entries().begin(), entries().end(), copy.entries().begin(),
+                                      copy.entries().end(), [](const Entry& entry, const Entry& other) {
                                           return other.value.isCopyOf(entry.value);
                                       });
 }
@@ -209,14 +227,15 @@ bool Dictionary::isCopy(const Dictionary& copy) const {
 void Dictionary::becomeCopyOf(const Dictionary& source) {
     if (_copiedKeys != source._keysChanged) {
         _copiedKeys = neverChanged; // for when memory is short on the way
-        _entries.resize(source._entries.size());
-        for (std::size_t i = 0; i < _entries.size(); ++i) {
+        _entries.resize(std::max(_entries.size(), source._count));
+        _count = source._count;
+        for (std::size_t i = 0; i < _count; ++i) {
             _entries[i].key = source._entries[i].key;
             _entries[i].value.assignCopy(source._entries[i].value);
         }
         rebuildIndex();
     } else if (_copiedEntries != source._entriesChanged || source._holdsNodes) {
-        for (std::size_t i = 0; i < _entries.size(); ++i)
+        for (std::size_t i = 0; i < _count; ++i)
             _entries[i].value.assignCopy(source._entries[i].value);
     }
     _copiedKeys = source._keysChanged;
@@ -236,9 +255,9 @@ void Dictionary::becomeCopyOf(const Dictionary& source) {
 
 void Dictionary::rebuildIndex() {
     _index.clear();
-    if (_entries.size() < indexedFrom)
+    if (_count < indexedFrom)
         return;
-    for (std::size_t i = 0; i < _entries.size(); ++i)
+    for (std::size_t i = 0; i < _count; ++i)
         _index.emplace(_entries[i].key, i);
 }
 

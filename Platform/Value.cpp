@@ -111,6 +111,25 @@ void Array::append(Value value) {
     ++_changes;
 }
 
+Dictionary& Array::appendRow() {
+    expectMutable();
+    static_cast<void>(written());
+    DictionaryRef row;
+    if (_values.size() < _spent.values.size()) {
+        auto* const spent = std::get_if<DictionaryRef>(&_spent.values[_values.size()]._held);
+        if (spent && *spent && spent->use_count() == 1 && !(*spent)->isFrozen()) {
+            row = std::move(*spent);
+            row->clear();
+        }
+    }
+    if (!row)
+        row = makeDictionary();
+    Dictionary& result = *row;
+    _values.emplace_back(std::move(row));
+    ++_changes;
+    return result;
+}
+
 void Array::clear() {
     expectMutable();
     _later.turn = 0;
@@ -137,6 +156,10 @@ void Array::writeNow() const {
     const std::uint64_t changes = _changes;
     const std::uint64_t turn = std::exchange(self._later.turn, 0);
     const bool frozen = std::exchange(self._frozen, false);
+    // Those that a longer list has left before stay behind them.
+    std::vector<Value>& spent = self._spent.values;
+    spent.resize(std::max(spent.size(), _values.size()));
+    std::move(self._values.begin(), self._values.end(), spent.begin());
     self._values.clear();
     try {
         _later.writing.write(self, _later.bytes, _later.writing.table);

@@ -10,6 +10,7 @@
 #include <cstdint>
 #include <memory>
 #include <optional>
+#include <span>
 #include <string>
 #include <string_view>
 #include <unordered_map>
@@ -110,6 +111,10 @@ public:
     [[nodiscard]] auto end() const { return written().end(); }
 
     void append(Value value);
+    /// Appends a dictionary without entries, to be filled in. While elements are written anew (`writeLater`)
+    /// it is the one that stood in its place before, unless somebody else holds that: a list that is looked
+    /// at after each record takes no more memory than its rows.
+    Dictionary& appendRow();
     void clear();
     /// Removes the first `count` values (all of them where there are fewer).
     void removeFirst(std::size_t count);
@@ -133,7 +138,18 @@ private:
     void becomeCopyOf(const Array& source);
     void expectMutable() const;
 
+    /// What a writing has left of the elements before. A copy of the array starts without any.
+    struct Spent {
+        Spent() = default;
+        Spent(const Spent&) noexcept {}
+        Spent& operator=(const Spent&) noexcept { return *this; }
+        ~Spent() = default;
+
+        std::vector<Value> values;
+    };
+
     std::vector<Value> _values;
+    Spent _spent;
     LaterWriting<Array> _later;
     std::uint64_t _changes = 0; ///< counts every change
     mutable FrozenCopies<Array> _copies;
@@ -151,6 +167,10 @@ public:
     };
 
     Dictionary() = default;
+    /// A copy is made even where the other could be taken over, whose number of entries must stay true.
+    Dictionary(const Dictionary&) = default;
+    Dictionary& operator=(const Dictionary&) = default;
+    ~Dictionary() = default;
     /// Sets each entry in turn, so that a key given twice keeps its first place and its last value.
     Dictionary(std::initializer_list<Entry> entries);
 
@@ -174,6 +194,9 @@ public:
     void reserve(std::size_t count) { _entries.reserve(count); }
     /// Whether there was such a key.
     bool remove(std::string_view key);
+    /// Removes all entries. Their storage stays for those that are set next, which are best set in the same
+    /// order.
+    void clear();
     /// Has the bytes written, as all that is set before and after would have it, when somebody looks for
     /// values. The first time, when the keys may not be there yet, they are written at once.
     void writeLater(const Writing<Dictionary>& writing, Bytes bytes);
@@ -195,11 +218,13 @@ private:
     };
 
     /// The entries, after what was to be written later has been.
-    const std::vector<Entry>& written() const {
+    std::span<const Entry> written() const {
         if (_due)
             writeNow();
-        return _entries;
+        return entries();
     }
+    [[nodiscard]] std::span<const Entry> entries() const { return {_entries.data(), _count}; }
+    [[nodiscard]] std::span<Entry> entries() { return {_entries.data(), _count}; }
     void writeNow() const;
     [[nodiscard]] DictionaryRef frozenCopy() const;
     [[nodiscard]] bool isCopy(const Dictionary& copy) const;
@@ -208,14 +233,15 @@ private:
     /// The key's place in `_entries`, or nowhere.
     [[nodiscard]] std::size_t indexOf(std::string_view key) const;
     Value& slot(std::string_view key);
-    Value& add(std::string_view key, Value value);
+    Value& add(std::string_view key);
     void erase(std::size_t index);
     /// What `removeLater` has done later: the bytes are the key.
     static void eraseKey(Dictionary& dictionary, Bytes key, const void*);
     void rebuildIndex();
     void expectMutable() const;
 
-    std::vector<Entry> _entries;
+    std::vector<Entry> _entries; ///< and behind the first `_count` of them what `clear` has left
+    std::size_t _count = 0;
     /// Where keys were found last, by where in memory they stood when they were asked for: most are constants
     /// and asked for again and again. Hints only.
     mutable std::array<std::uint8_t, 16> _found{};

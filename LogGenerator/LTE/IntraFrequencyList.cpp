@@ -16,10 +16,7 @@ void IntraFrequencyList::updateWithData(const Data& data, std::uint32_t logCode)
     if (record.size() < IntraFrequencyRecord::minimumLength)
         return;
     const IntraFrequencyRecord measurement(record);
-    if (const CountedList& cells = (measurement.*_cells)(); cells.count() > 0)
-        showRows(cells, _cell, logCode);
-    else
-        clearElements();
+    showRows((measurement.*_cells)(), _cell, logCode);
 }
 
 } // namespace velmora

@@ -51,7 +51,6 @@ void NeighborCellsList::updateWithData(const Data& data, std::uint32_t logCode) 
     const Record record(data);
     if (record.size() < NeighborRecord::minimumLength)
         return;
-    clearElements();
     const NeighborRecord measurement(record);
     const CountedList& cells = measurement.cells();
     logFormat(LogPriority::Warning, "Number of neighboring cells being reported: %d\n",

@@ -68,10 +68,9 @@ void fill(Array& rows, const Record& record) {
     const CountedList headers = reselection.candidates(header.minimumLength);
     for (std::size_t i = 0, count = wholeCandidates(reselection, headers); i < count; ++i) {
         const Layout& detail = detailsOf(headers[i]);
-        const DictionaryRef row = makeDictionary();
-        writeFields(*row, headers[i], header);
-        writeFields(*row, reselection.candidates(detail.minimumLength)[i], detail);
-        rows.append(row);
+        Dictionary& row = rows.appendRow();
+        writeFields(row, headers[i], header);
+        writeFields(row, reselection.candidates(detail.minimumLength)[i], detail);
     }
 }
 
@@ -86,11 +85,8 @@ void ReselectionCandidatesList::updateWithData(const Data& data, std::uint32_t l
     const Record record(data);
     if (record.size() < ReselectionRecord::minimumLength)
         return;
-    clearElements();
     const ReselectionRecord reselection(record);
     const CountedList headers = reselection.candidates(header.minimumLength);
-    if (headers.count() == 0)
-        return;
     reportMissingEntries(wholeCandidates(reselection, headers), headers.count(), logCode);
     showElementsWith<fill>(record);
 }

@@ -24,10 +24,9 @@ void fill(Array& rows, const Record& record) {
     const CountedList entries = networks(record);
     for (std::size_t i = 0; i < entries.whole(); ++i) {
         const Record e = entries[i];
-        const DictionaryRef row = makeDictionary();
-        row->setText("Mobile Country Code", NumberText("%d", threeDigits(e.u8(0), e.u8(2), e.u8(4))).text());
-        row->setText("Mobile Network Code", NumberText("%d", threeDigits(e.u8(1), e.u8(3), e.u8(5))).text());
-        rows.append(row);
+        Dictionary& row = rows.appendRow();
+        row.setText("Mobile Country Code", NumberText("%d", threeDigits(e.u8(0), e.u8(2), e.u8(4))).text());
+        row.setText("Mobile Network Code", NumberText("%d", threeDigits(e.u8(1), e.u8(3), e.u8(5))).text());
     }
 }
 
@@ -42,10 +41,7 @@ void EquivalentPLMNList::updateWithData(const Data& data, std::uint32_t logCode)
     const Record record(data);
     if (record.size() < minimumLength)
         return;
-    clearElements();
     const CountedList entries = networks(record);
-    if (entries.count() == 0)
-        return;
     // The list ends with the last entry that lies wholly inside the record.
     reportMissingEntries(entries, logCode);
     showElementsWith<fill>(record);

@@ -30,11 +30,8 @@ void GSMSet::updateWithData(const Data& data, std::uint32_t logCode) {
     const Record record(data);
     if (record.size() < minimumLength)
         return;
-    clearElements();
     const CountedList entries(record, minimumLength, cell.minimumLength,
                               static_cast<std::size_t>(count.read(record)));
-    if (entries.count() == 0)
-        return;
     showRows(entries, cell, logCode);
 }
 

@@ -40,15 +40,14 @@ void fill(Array& rows, const Record& bytes) {
     const std::size_t behind = 1 + cells.count() * measured.minimumLength;
     const CountedList bsics(bytes, behind, bsicEntryLength, (bytes.size() - behind) / bsicEntryLength);
     for (std::size_t i = 0; i < cells.count(); ++i) {
-        const DictionaryRef row = makeDictionary();
-        writeFields(*row, cells[i], measured);
+        Dictionary& row = rows.appendRow();
+        writeFields(row, cells[i], measured);
         // Of an ARFCN that stands there twice, the later one counts.
         for (std::size_t j = bsics.count(); j-- > 0;)
             if (bsicARFCN.read(bsics[j]) == measuredARFCN.read(cells[i])) {
-                writeValue(*row, "BSIC", integer("%d"), bsic.read(bsics[j]));
+                writeValue(row, "BSIC", integer("%d"), bsic.read(bsics[j]));
                 break;
             }
-        rows.append(row);
     }
 }
 
@@ -68,10 +67,7 @@ void NeighboringCells::updateWithData(const Data& data, std::uint32_t logCode) {
 void NeighboringCells::showMeasuredCells(const Record& record) {
     if (record.size() < measuredMinimumLength)
         return;
-    clearElements();
     const CountedList entries(record, measuredMinimumLength, measured.minimumLength, record.u8(28));
-    if (entries.count() == 0)
-        return;
     reportMissingEntries(entries, 0x5137);
     // The BSICs as they are known now go with the cells.
     const Bytes cells = entries.entries().bytes();
@@ -91,11 +87,10 @@ void NeighboringCells::keepBSICs(const Record& record) {
 }
 
 void NeighboringCells::showKnownCells(const Data& data) {
-    clearElements(); // first, so that the list is empty where the cells cannot be had
-    const std::vector<Cell>* cells = cellsOf(data);
-    if (!cells)
-        return;
-    writeCellRows(array(), *cells, known, _knownCells);
+    if (const std::vector<Cell>* cells = cellsOf(data))
+        writeCellRows(array(), *cells, known, _knownCells);
+    else
+        clearElements();
 }
 
 } // namespace velmora

@@ -50,20 +50,16 @@ void UMTSSet::updateWithData(const Data& data, std::uint32_t logCode) {
 void UMTSSet::showRankedCells(const Record& record) {
     if (record.size() < rankedMinimumLength)
         return;
-    clearElements();
     const CountedList entries(record, rankedMinimumLength, ranked.minimumLength,
                               static_cast<std::size_t>(rankedCount.read(record)));
-    if (entries.count() == 0)
-        return;
     showRows(entries, ranked, 0x4005);
 }
 
 void UMTSSet::showKnownCells(const Data& data) {
-    clearElements(); // first, so that the list is empty where the cells cannot be had
-    const std::vector<Cell>* cells = cellsOf(data);
-    if (!cells)
-        return;
-    writeCellRows(array(), *cells, known, _knownCells);
+    if (const std::vector<Cell>* cells = cellsOf(data))
+        writeCellRows(array(), *cells, known, _knownCells);
+    else
+        clearElements();
 }
 
 } // namespace velmora

@@ -37,10 +37,9 @@ CountedList compositeChannels(const Record& record) {
 void fill(Array& rows, const Record& record) {
     const CountedList channels = compositeChannels(record);
     for (std::size_t i = 0; i < channels.whole(); ++i) {
-        const DictionaryRef row = makeDictionary();
-        writeFields(*row, channels[i], channel);
-        row->set("SIR", std::make_shared<Array>(ratios(channels[i])));
-        rows.append(row);
+        Dictionary& row = rows.appendRow();
+        writeFields(row, channels[i], channel);
+        row.set("SIR", std::make_shared<Array>(ratios(channels[i])));
     }
 }
 
@@ -51,7 +50,6 @@ void CCTRCHSIRMeasurement::updateWithData(const Data& data, std::uint32_t logCod
     const Record record(data);
     if (logCode != quality::code || record.size() < quality::minimumLength)
         return;
-    clearElements();
     reportMissingEntries(compositeChannels(record), logCode);
     showElementsWith<fill>(record);
 }

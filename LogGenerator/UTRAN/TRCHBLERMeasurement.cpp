@@ -22,7 +22,6 @@ void TRCHBLERMeasurement::updateWithData(const Data& data, std::uint32_t logCode
     const Record record(data);
     if (logCode != quality::code || record.size() < quality::minimumLength)
         return;
-    clearElements();
     const CountedList channels(record, quality::minimumLength, quality::transportChannelLength,
                                static_cast<std::size_t>(quality::transportChannels.read(record)));
     showRows(channels, channel, logCode);

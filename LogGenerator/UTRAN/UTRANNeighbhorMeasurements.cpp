@@ -40,12 +40,11 @@ CountedList cells(const Record& record) {
 void fill(Array& rows, const Record& record) {
     const CountedList entries = cells(record);
     for (std::size_t i = 0; i < entries.whole(); ++i) {
-        const DictionaryRef row = makeDictionary();
-        writeFields(*row, entries[i], cell);
+        Dictionary& row = rows.appendRow();
+        writeFields(row, entries[i], cell);
         if (const auto set = static_cast<std::size_t>(status.read(entries[i])); set < std::size(statusTexts))
-            row->setText("Status", statusTexts[set]);
-        writeFields(*row, entries[i], detection);
-        rows.append(row);
+            row.setText("Status", statusTexts[set]);
+        writeFields(row, entries[i], detection);
     }
 }
 
@@ -56,7 +55,6 @@ void UTRANNeighbhorMeasurements::updateWithData(const Data& data, std::uint32_t 
     const Record record(data);
     if (logCode != 0xD00A || record.size() < minimumLength)
         return;
-    clearElements();
     reportMissingEntries(cells(record), logCode);
     showElementsWith<fill>(record);
 }
