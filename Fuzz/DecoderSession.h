@@ -52,6 +52,10 @@ private:
     Value _template; ///< none where the technology has none
 };
 
+/// A reconnection makes a decoder, which takes the time of many messages. Those of a script beyond these are
+/// left out.
+inline constexpr int maximumReconnects = 3;
+
 /// A decoder and its state. Both are at their beginning.
 class DecoderSession {
 public:

@@ -7,10 +7,8 @@ namespace velmora {
 
 namespace {
 
-/// A redraw copies the display and a reconnection makes a decoder; a script of nothing else would only be
-/// slow. Those beyond these are left out.
+/// A redraw copies the display; a script of nothing else would only be slow. Those beyond these are left out.
 constexpr int maximumRedraws = 8;
-constexpr int maximumReconnects = 3;
 
 /// The input is a MessageScript that one decoder goes through.
 class DecoderTarget final : public FuzzTarget {

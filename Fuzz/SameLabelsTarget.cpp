@@ -69,8 +69,9 @@ public:
         DecoderSession busy(maker);
         MessageScript script(input.subspan(1));
         std::optional<Data> last;
+        int reconnects = 0;
         while (const auto step = script.next()) {
-            if (step->kind == MessageScript::Kind::Reconnect)
+            if (step->kind == MessageScript::Kind::Reconnect && ++reconnects <= maximumReconnects)
                 busy.reconnect();
             if (step->kind != MessageScript::Kind::Message)
                 continue;
