@@ -69,9 +69,7 @@ constexpr Row rows[] = {
     {0xFF0002, gsm | lte | utran},
 };
 
-constexpr bool before(const Row& a, const Row& b) {
-    return a.code < b.code;
-}
+constexpr auto before = [](const Row& a, const Row& b) { return a.code < b.code; };
 static_assert(std::is_sorted(std::begin(rows), std::end(rows), before));
 
 } // namespace

@@ -48,7 +48,7 @@ int evidenceOfTimestamp(std::uint64_t timestamp, std::optional<std::uint64_t> ne
     constexpr std::uint64_t day = std::uint64_t{86'400} * 800; // in units of 1.25 ms
     if (timestamp == 0)
         return nearby.value_or(0) == 0 ? Evidence::zeroAmongZeros : Evidence::zeroAmongTimes;
-    if (!timeOfRecord(timestamp))
+    if (!isRecordTime(timestamp))
         return Evidence::badTimestamp;
     if (nearby.value_or(0) == 0)
         return 0;
@@ -187,7 +187,7 @@ bool RecordChain::judge(std::size_t at, Candidate& candidate) {
     const std::size_t end = at + candidate.size;
     if (!_input.ensure(end))
         return false;
-    const bool hasTime = candidate.timestamp != 0 && timeOfRecord(candidate.timestamp);
+    const bool hasTime = candidate.timestamp != 0 && isRecordTime(candidate.timestamp);
     candidate.onward = _input.ensure(end + 1) ? evidenceAt(end, hasTime ? candidate.timestamp : _timestamp)
                                               : Evidence::endOfInput;
     return true;
@@ -223,7 +223,7 @@ bool RecordChain::holdsBetter(const Candidate& candidate) {
 
 RecordChain::Record RecordChain::take(const Candidate& candidate) {
     _present = candidate.size;
-    if (timeOfRecord(candidate.timestamp) && (candidate.timestamp != 0 || !_timestamp))
+    if (isRecordTime(candidate.timestamp) && (candidate.timestamp != 0 || !_timestamp))
         _timestamp = candidate.timestamp;
     Record record;
     record.offset = _input.offset();

@@ -42,11 +42,16 @@ static_assert(std::is_sorted(std::begin(leaps), std::end(leaps)));
 
 } // namespace
 
+bool isRecordTime(std::uint64_t timestamp) {
+    constexpr auto end = static_cast<std::uint64_t>((Time::max() - epoch) / unit);
+    return (timestamp & 0xFFFF) < std::uint64_t{chipPartsPerUnit} && timestamp >> 16 < end;
+}
+
 std::optional<Time> timeOfRecord(std::uint64_t timestamp) {
+    if (!isRecordTime(timestamp))
+        return std::nullopt;
     const auto units = static_cast<std::int64_t>(timestamp >> 16);
     const auto parts = static_cast<std::int64_t>(timestamp & 0xFFFF);
-    if (parts >= chipPartsPerUnit || units >= (Time::max() - epoch) / unit)
-        return std::nullopt;
     const nanoseconds rest((parts * unit.count() + chipPartsPerUnit / 2) / chipPartsPerUnit);
     const Time systemTime = epoch + units * unit + rest;
     // The last leap whose new second has come; within the inserted second itself UTC stands at that leap.

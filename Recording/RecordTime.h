@@ -15,6 +15,9 @@ namespace velmora {
 /// (the year 2262).
 [[nodiscard]] std::optional<Time> timeOfRecord(std::uint64_t timestamp);
 
+/// Whether there is such a moment.
+[[nodiscard]] bool isRecordTime(std::uint64_t timestamp);
+
 /// The time stamp of a moment, to the nearest 1/32 chip; 0 for moments before 1980-01-06. Leap seconds that
 /// have been announced after 2017 are not known.
 [[nodiscard]] std::uint64_t recordTimestamp(Time moment);
