@@ -246,15 +246,5 @@ TEST(DictionaryClearTest, WhatWasToBeWrittenLaterIsNot) {
     EXPECT_EQ(valueOf(node), valueOf(Dictionary{{"First", 1}, {"Byte", "1"}}));
 }
 
-TEST(DictionaryClearTest, ADictionaryThatWasMovedFromIsOneStill) {
-    Dictionary node{{"A", 1}};
-    const Dictionary taken = std::move(node);
-    EXPECT_EQ(valueOf(taken), valueOf(Dictionary{{"A", 1}}));
-    EXPECT_EQ(node.size(), static_cast<std::size_t>(std::distance(node.begin(), node.end()))); // NOLINT
-    node.clear();
-    node.set("B", 2);
-    EXPECT_EQ(valueOf(node), valueOf(Dictionary{{"B", 2}}));
-}
-
 } // namespace
 } // namespace velmora
