@@ -156,12 +156,12 @@ void Array::writeNow() const {
     const std::uint64_t changes = _changes;
     const std::uint64_t turn = std::exchange(self._later.turn, 0);
     const bool frozen = std::exchange(self._frozen, false);
-    // Those that a longer list has left before stay behind them.
-    std::vector<Value>& spent = self._spent.values;
-    spent.resize(std::max(spent.size(), _values.size()));
-    std::move(self._values.begin(), self._values.end(), spent.begin());
-    self._values.clear();
     try {
+        // Those that a longer list has left before stay behind them.
+        std::vector<Value>& spent = self._spent.values;
+        spent.resize(std::max(spent.size(), _values.size()));
+        std::move(self._values.begin(), self._values.end(), spent.begin());
+        self._values.clear();
         _later.writing.write(self, _later.bytes, _later.writing.table);
         if (frozen)
             for (Value& value : self._values)
