@@ -31,7 +31,7 @@ constexpr NumberedTexts roamingIndicators(roamingIndicatorRows, "ERI - ", "");
 constexpr ValueField roaming[] = {
     {"k1xRoamingHome", u32At(42), roamingIndicators},
 };
-constexpr Where systemType = u32At(46);
+constexpr std::size_t systemTypeAt = 46;
 constexpr std::uint32_t cdmaSystem = 2;
 constexpr ValueField identities[] = {
     // Those of a system of another type mean something else.
@@ -50,6 +50,11 @@ constexpr ValueField revision[] = {
 static_assert(endOf(roaming, true) <= minimumLength && endOf(identities, true) <= minimumLength &&
               endOf(zone, true) <= minimumLength && endOf(revision, true) <= minimumLength);
 
+/// What stands for the identities of a system of another type, whose number is in these bytes.
+Value unknownSystem(Bytes type, const void*) {
+    return "(unknown system type " + std::to_string(static_cast<std::int32_t>(Record(type).u32(0))) + ")";
+}
+
 } // namespace
 
 void SystemIdentification::parse(const Record& record, Dictionary&, const Publisher& publisher) const {
@@ -65,13 +70,11 @@ void SystemIdentification::parse(const Record& record, Dictionary&, const Publis
         return;
     }
     publishFields(publisher, record, roaming, true);
-    if (const auto type = static_cast<std::uint32_t>(systemType.read(record)); type == cdmaSystem) {
+    if (const Record type = record.part(systemTypeAt, 4); type.u32(0) == cdmaSystem) {
         publishFields(publisher, record, identities, true);
     } else {
-        const std::string text =
-            "(unknown system type " + std::to_string(static_cast<std::int32_t>(type)) + ")";
         for (const ValueField& identity : identities)
-            publisher.publish(identity.key, text);
+            publisher.publishLater(identity.key, unknownSystem, nullptr, type.bytes());
     }
     publishFields(publisher, record, zone, true);
     if (record.size() >= endOf(baseStation, true))

@@ -8,8 +8,9 @@ namespace velmora::C2K {
 
 namespace {
 
-/// Kept keys; a multiple of what the parsers have, so that few places are asked for by two.
+/// For kept keys; a multiple of what the parsers have, so that few places are asked for by two.
 constexpr std::size_t places = 256;
+constexpr std::size_t mostKeys = places / 2;
 
 bool isSameConstant(std::string_view a, std::string_view b) {
     return a.data() == b.data() && a.size() == b.size();
@@ -25,21 +26,37 @@ void Targets::use(const DictionaryRef& lookup) {
     _watch = lookup;
     _lookup = lookup.get();
     _foundKeys.clear();
+    _keptKeys = 0;
     _foundFields.clear();
 }
 
 std::span<const Targets::Target> Targets::of(std::string_view valueKey) {
-    if (_foundKeys.empty())
-        _foundKeys.resize(places);
-    const auto address = reinterpret_cast<std::uintptr_t>(valueKey.data());
-    FoundKey& found = _foundKeys[(address ^ address >> 8) % places];
-    // The place may be another key's, and the bytes there may have become another key.
+    FoundKey& found = placeOf(valueKey);
+    // The bytes there may have become another key.
     if (!isSameConstant(found.constant, valueKey) || found.key != valueKey) {
         found.targets = find(valueKey);
         found.key = valueKey;
+        _keptKeys += found.constant.data() == nullptr ? 1 : 0;
         found.constant = valueKey;
     }
     return found.targets;
+}
+
+/// Where the key is kept, or the empty place where it is to be: at the one that its address tells, or behind
+/// it.
+Targets::FoundKey& Targets::placeOf(std::string_view valueKey) {
+    if (_keptKeys == mostKeys) {
+        _foundKeys.clear();
+        _keptKeys = 0;
+    }
+    if (_foundKeys.empty())
+        _foundKeys.resize(places);
+    const auto address = reinterpret_cast<std::uintptr_t>(valueKey.data());
+    std::size_t place = (address ^ address >> 8) % places;
+    while (_foundKeys[place].constant.data() != nullptr &&
+           !isSameConstant(_foundKeys[place].constant, valueKey))
+        place = (place + 1) % places;
+    return _foundKeys[place];
 }
 
 const Targets::Screens& Targets::of(std::span<const ValueField> fields) {

@@ -43,7 +43,8 @@ public:
 
 private:
     struct FoundKey {
-        std::string_view constant; ///< as it was asked for; its place in memory tells where to look for it
+        std::string_view constant; ///< as it was asked for; its place in memory tells where to look for it;
+                                   ///< none where the place is empty
         std::string key;
         std::vector<Target> targets;
     };
@@ -52,12 +53,14 @@ private:
         Screens screens;
     };
 
+    [[nodiscard]] FoundKey& placeOf(std::string_view valueKey);
     [[nodiscard]] std::vector<Target> find(std::string_view valueKey) const;
     [[nodiscard]] Screens find(std::span<const ValueField> fields);
 
     std::weak_ptr<const Dictionary> _watch; ///< tells a lookup from a later one in the same place in memory
     const Dictionary* _lookup = nullptr;
     std::vector<FoundKey> _foundKeys;
+    std::size_t _keptKeys = 0;
     std::vector<FoundFields> _foundFields;
 };
 

@@ -81,6 +81,22 @@ TEST_F(PublisherTest, AKeyIsFoundByItsTextWhereverThatStandsInMemory) {
     EXPECT_EQ(shown(screen), "{One 'a', Two 'b'}");
 }
 
+TEST_F(PublisherTest, ThousandsOfKeysAreKeptApart) {
+    std::vector<std::string> keys;
+    for (int i = 0; i < 3000; ++i) {
+        keys.push_back("k" + std::to_string(i));
+        lookup->set(keys.back(), std::make_shared<Array>(Array{target(std::to_string(i), screen)}));
+    }
+    C2K::Targets targets;
+    targets.use(lookup);
+    for (const char* round : {"first", "second"})
+        for (const std::string& key : keys)
+            C2K::Publisher(targets).publish(key, key + round);
+    ASSERT_EQ(screen->size(), keys.size());
+    for (int i = 0; i < 3000; ++i)
+        EXPECT_EQ((*screen)[std::to_string(i)], Value(keys[static_cast<std::size_t>(i)] + "second"));
+}
+
 TEST_F(PublisherTest, EffectsAreToldOfEveryValueShownOrNot) {
     const std::vector<std::pair<std::string, Value>> told = {{"kA", Value("new")}, {"kB", Value("+1.00 dB")}};
     lookup->set("kA", std::make_shared<Array>(Array{target("One", screen)}));
