@@ -1,0 +1,95 @@
+#include "LogGenerator/LogGenerator.h"
+#include "Platform/SystemLog.h"
+#include "Telephony/ScenarioRegistry.h"
+#include "Tests/Memory/Allocations.h"
+#include "Tests/Support/FakeClock.h"
+#include "Tests/Support/FakeResources.h"
+#include "Tests/Support/ShippedResources.h"
+
+#include <gtest/gtest.h>
+
+#include <cstdint>
+#include <memory>
+#include <ostream>
+#include <string>
+#include <vector>
+
+// A decoder that has seen a drive decodes it again without allocating anything.
+
+namespace velmora {
+namespace {
+
+/// Takes the lines that are wanted at the level programs start with, and keeps none.
+class ForgetfulLog final : public SystemLog {
+public:
+    ForgetfulLog()
+        : _earlierLevel(detail::systemLogLevel), _earlier(setSystemLog(this, LogPriority::Error)) {}
+    ~ForgetfulLog() override { setSystemLog(_earlier, _earlierLevel); }
+    ForgetfulLog(const ForgetfulLog&) = delete;
+    ForgetfulLog& operator=(const ForgetfulLog&) = delete;
+
+    void write(int, std::string_view) override {}
+
+private:
+    int _earlierLevel;
+    SystemLog* _earlier;
+};
+
+struct Drive {
+    std::string scenario;
+    std::string resource; ///< the technology's template
+
+    friend std::ostream& operator<<(std::ostream& out, const Drive& drive) { return out << drive.scenario; }
+};
+
+class SteadyStateTest : public testing::TestWithParam<Drive> {
+    FakeClock _clock;
+    FakeResources _resources;
+    ForgetfulLog _log;
+
+protected:
+    SteadyStateTest() {
+        const std::string& resource = GetParam().resource;
+        _resources.put(resource, "plist", shippedResource(resource + ".plist"));
+        const auto scenario = scenarioKindNamed(GetParam().scenario)->make(1);
+        decoder = LogGenerator::generatorFromTechnology(scenario->technology(), _clock);
+        // Which keeps the messages themselves.
+        decoder->setKeepsHistory(false);
+        messages.resize(10000);
+        for (Data& message : messages)
+            message = scenario->next().message;
+    }
+
+    /// Decodes the drive. What that allocates, the redraws left out.
+    std::uint64_t allocationsOfDrive() {
+        std::uint64_t allocations = 0;
+        for (std::size_t i = 0; i < messages.size(); ++i) {
+            {
+                const Allocations counted;
+                decoder->updateState(state, messages[i]);
+                allocations += counted.count();
+            }
+            if (i % redrawEvery == 0)
+                static_cast<void>(decoder->generateLogUsingState(state));
+        }
+        return allocations;
+    }
+
+    static constexpr std::size_t redrawEvery = 100;
+    std::unique_ptr<LogGenerator> decoder;
+    std::vector<Data> messages;
+    Dictionary state;
+};
+
+TEST_P(SteadyStateTest, UpdatesAllocateNothing) {
+    EXPECT_GT(allocationsOfDrive(), 100u);
+    EXPECT_EQ(allocationsOfDrive(), 0u);
+}
+
+INSTANTIATE_TEST_SUITE_P(Drives, SteadyStateTest,
+                         testing::Values(Drive{"gsm", "Ostrel_GSM"}, Drive{"lte", "LTE"},
+                                         Drive{"utran", "Ostrel_UTRAN"}, Drive{"c2k", "C2KTemplate"}),
+                         [](const auto& drive) { return drive.param.scenario; });
+
+} // namespace
+} // namespace velmora
