@@ -177,6 +177,7 @@ Figures application(int argc, char** argv, std::int64_t begun_us) {
     show(displayMessage(redrawRows, 0));
     QApplication::processEvents();
     std::vector<Data> messages; // what the service does is not the screen's
+    messages.reserve(21);
     for (int i = 0; i < 21; ++i)
         messages.push_back(displayMessage(redrawRows, i));
     return report(first, begun_us,

@@ -74,9 +74,9 @@ std::optional<RecordBuilder> security(GSMReportContext& context) {
 std::optional<RecordBuilder> transmitPower(GSMReportContext& context) {
     // Open-loop: the further away, the louder.
     const double wanted = -85.0 - context.phone.umts.rscp_dBm;
-    std::vector<double> powers;
-    for (int slot = 0; slot < 5; ++slot)
-        powers.push_back(std::clamp(wanted + context.random.normal(), -50.0, 24.0));
+    std::vector<double> powers(5);
+    for (double& power : powers)
+        power = std::clamp(wanted + context.random.normal(), -50.0, 24.0);
     return transmitPowers(powers);
 }
 

@@ -9,7 +9,6 @@ namespace {
 
 using namespace std::chrono_literals;
 using testing::Contains;
-using testing::IsEmpty;
 
 class SelfTestTest : public AppFixture {
 protected:

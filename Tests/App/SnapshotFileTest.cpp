@@ -14,7 +14,6 @@ namespace {
 
 using namespace std::chrono_literals;
 using testing::ElementsAre;
-using testing::HasSubstr;
 
 /// The file that the save screen leaves behind.
 class SnapshotFileTest : public SaveScreenFixture {

@@ -151,8 +151,8 @@ TEST(CellListTest, OtherFormsOfTheXMLSayTheSame) {
              "<array><dict>KEY<integer>1</integer></dict></array></plist>",
              "<array><dict>KEY</dict></array>",
              "<array><dict>KEY<integer>1</integer><key>a &amp; b</key><integer>2</integer></dict></array>",
-             "<array><dict><key>kVoxCellMonitorCellRadioAccessTechnology</key><integer>1</integer></dict></"
-             "array>",
+             ("<array><dict><key>kVoxCellMonitorCellRadioAccessTechnology</key><integer>1</integer>"
+              "</dict></array>"),
              "<array><dict><key>kVoxCellMonitorCellType</key><integer>1</integer></dict></array>",
              "<array><dict>KEY<integer>1</integer><key>a & b</key><integer>2</integer></dict></array>",
          }) {

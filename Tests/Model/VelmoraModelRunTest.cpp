@@ -7,7 +7,6 @@ namespace {
 
 using namespace std::chrono_literals;
 using testing::Contains;
-using testing::ElementsAre;
 using testing::IsEmpty;
 using testing::MatchesRegex;
 

@@ -25,6 +25,9 @@ std::string formatted(const char* format, std::va_list arguments) {
 
 } // namespace
 
+// The names are the library's, those of its parameters not.
+// NOLINTBEGIN(bugprone-reserved-identifier,readability-inconsistent-declaration-parameter-name)
+
 extern "C" void openlog(const char* identity, int options, int facility) {
     syslogCalls.push_back(std::string("open ") + identity + (options & LOG_PID ? " with pid" : "") +
                           (facility == LOG_USER ? " as user" : ""));
@@ -41,16 +44,17 @@ extern "C" void syslog(int priority, const char* format, ...) {
     va_end(arguments);
 }
 
-// What syslog becomes in a fortified build. The names are the library's.
-// NOLINTNEXTLINE(bugprone-reserved-identifier)
+// What syslog becomes in a fortified build, where the library's header knows it.
+// NOLINTNEXTLINE(readability-redundant-declaration)
 extern "C" void __syslog_chk(int priority, int, const char* format, ...);
-// NOLINTNEXTLINE(bugprone-reserved-identifier)
 extern "C" void __syslog_chk(int priority, int, const char* format, ...) {
     std::va_list arguments;
     va_start(arguments, format);
     syslogCalls.push_back(std::to_string(priority) + " " + formatted(format, arguments));
     va_end(arguments);
 }
+
+// NOLINTEND(bugprone-reserved-identifier,readability-inconsistent-declaration-parameter-name)
 
 namespace velmora {
 

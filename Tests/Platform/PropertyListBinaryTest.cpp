@@ -281,7 +281,7 @@ TEST(BinaryReader, RefusesAMillionNestedArrays) {
     for (std::uint64_t i = 0; i < 1'000'000; ++i) {
         Buffer array = {0xA1};
         appendBigEndian(array, i + 1, 4);
-        arrays.push_back(Data(std::move(array)));
+        arrays.emplace_back(std::move(array));
     }
     arrays.push_back(hex("A0"));
     EXPECT_EQ(reasonOf(listOf(arrays)), "offset 648: an array is nested deeper than 128");
@@ -294,7 +294,7 @@ TEST(BinaryReader, RefusesExponentialFanOut) {
         Buffer array = {0xAA};
         for (int reference = 0; reference < 10; ++reference)
             appendBigEndian(array, i + 1, 4);
-        arrays.push_back(Data(std::move(array)));
+        arrays.emplace_back(std::move(array));
     }
     arrays.push_back(hex("53 6C6F6C"));
     EXPECT_EQ(reasonOf(listOf(arrays)), "the list has more than 1000000 objects");

@@ -16,7 +16,6 @@ namespace {
 
 using testing::ElementsAre;
 using testing::HasSubstr;
-using testing::IsEmpty;
 
 /// The field's capture tools on what we write, and we on what they write.
 class CaptureTools : public testing::Test {

@@ -18,9 +18,10 @@ struct ShellOutcome {
 [[nodiscard]] std::string shellQuoted(const std::string& words);
 
 /// Skips the test where the machine lacks a program.
-// NOLINTNEXTLINE(bugprone-macro-parentheses) a literal, which is joined to another
+// NOLINTBEGIN(bugprone-macro-parentheses) a literal, which is joined to another
 #define NEEDS_PROGRAM(program)                                                                               \
     if (velmora::runShell("command -v " program).status != 0)                                                \
     GTEST_SKIP() << program << " is not installed"
+// NOLINTEND(bugprone-macro-parentheses)
 
 } // namespace velmora

@@ -10,7 +10,6 @@ namespace velmora {
 namespace {
 
 using testing::ElementsAre;
-using testing::IsEmpty;
 
 const auto make = inDictionary<LTEServingCellInfo>;
 constexpr std::string_view trace = "LTE Serving Cell Info";
