@@ -50,7 +50,7 @@ public:
     /// False where not all of it could be kept; then none of it is.
     bool append(std::string_view text) {
         std::string_view rest = text;
-        off_t at = static_cast<off_t>(_size);
+        auto at = static_cast<off_t>(_size);
         while (!rest.empty()) {
             const ssize_t count = ::pwrite(_file.get(), rest.data(), rest.size(), at);
             if (count < 0 && errno == EINTR)

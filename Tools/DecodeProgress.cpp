@@ -1,6 +1,7 @@
 #include "Tools/DecodeProgress.h"
 
 #include <algorithm>
+#include <cmath>
 #include <utility>
 
 #include <sys/stat.h>
@@ -36,13 +37,15 @@ void DecodeProgress::look(std::uint64_t offset) {
     if (now - _shown < showInterval || elapsed <= 0)
         return;
     _shown = now;
-    // A file may grow while it is read.
+    // A file may grow while it is read, from nothing even: then there is no telling how much is left.
     const std::uint64_t done = std::min(offset, _size);
+    if (done == 0)
+        return;
     const double bytesPerSecond = static_cast<double>(done) / elapsed;
     const double left = static_cast<double>(_size - done) / bytesPerSecond;
     _show(std::to_string(static_cast<int>(100.0 * static_cast<double>(done) / static_cast<double>(_size))) +
           " %, " + std::to_string(static_cast<std::uint64_t>(bytesPerSecond / mebibyte)) + " MiB/s, " +
-          duration(static_cast<std::uint64_t>(left + 0.5)) + " left");
+          duration(static_cast<std::uint64_t>(std::llround(left))) + " left");
 }
 
 std::optional<std::uint64_t> inputSize(const std::string& path) {

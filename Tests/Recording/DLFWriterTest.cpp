@@ -21,7 +21,6 @@
 namespace velmora {
 namespace {
 
-using testing::ElementsAre;
 using testing::IsEmpty;
 
 class DLFWriterTest : public testing::Test {

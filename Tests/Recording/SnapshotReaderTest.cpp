@@ -243,7 +243,9 @@ TEST(SnapshotReader, refusesOtherPropertyLists) {
 
 TEST(SnapshotReader, losesObjectsAbove16MiB) {
     const DictionaryRef object = makeDictionary();
-    object->set("State", std::string(16'777'216, 'x'));
+    std::string longText;
+    longText.resize(16'777'216, 'x');
+    object->set("State", longText);
     const DictionaryRef small = makeDictionary();
     small->set("State", "x");
     const ReadOut out = readAnyForm(snapshotFile({historyEntry(object, "2026-11-16 05:00:02 +0000"),

@@ -40,6 +40,15 @@ TEST(DecodeProgressTest, ShowsPercentRateAndTimeLeft) {
                                    "100 %, 9 MiB/s, 0 s left"));
 }
 
+TEST(DecodeProgressTest, AFileThatWasEmptyHasNoShares) {
+    FakeClock clock;
+    std::vector<std::string> lines;
+    DecodeProgress progress(0, clock, [&](std::string_view line) { lines.emplace_back(line); });
+    clock.advance(1s);
+    progress.at(2 * mebibyte);
+    EXPECT_THAT(lines, ElementsAre("0 %"));
+}
+
 TEST(DecodeProgressTest, OnlyFilesHaveASize) {
     const TemporaryDirectory directory;
     std::ofstream(directory / "five") << "bytes";

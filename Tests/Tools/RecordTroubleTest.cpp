@@ -18,7 +18,7 @@ using testing::ElementsAre;
 class RecordTroubleTest : public RecordTest {
 protected:
     [[nodiscard]] std::uintmax_t size() const { return std::filesystem::file_size(path("drive.pcapng")); }
-    [[nodiscard]] std::string words(std::vector<std::string> lines) const {
+    [[nodiscard]] std::string words(const std::vector<std::string>& lines) const {
         std::string text;
         for (const std::string& line : lines)
             text += "velmora-log: " + line + "\n";

@@ -18,7 +18,6 @@ namespace {
 
 using ::testing::AllOf;
 using ::testing::HasSubstr;
-using ::testing::MatchesRegex;
 
 class RealModemManagerTest : public ModemManagerProcesses {
 protected:

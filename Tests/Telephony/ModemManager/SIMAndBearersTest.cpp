@@ -8,7 +8,6 @@ namespace velmora {
 namespace {
 
 using namespace std::chrono_literals;
-using ::testing::IsEmpty;
 
 Value dictionary(std::initializer_list<Dictionary::Entry> entries) {
     return std::make_shared<Dictionary>(entries);
