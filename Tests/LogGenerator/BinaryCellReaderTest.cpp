@@ -177,6 +177,19 @@ TEST(BinaryCellReaderTest, OffsetsAndReferencesAreOneOrTwoBytesWide) {
             << c.offsets << " and " << c.references;
 }
 
+TEST(BinaryCellReaderTest, OffsetsOfThreeBytesAreNotTakenForLongerOnes) {
+    // Eight bytes from the table on are the number 8, where the empty array stands.
+    const char* const list = "62 70 6C 69 73 74 30 30 "  // "bplist00"
+                             "A0 "                       // offset 8: an array of nothing
+                             "00 00 00 "                 // the table: offset 0
+                             "00 00 00 00 08 00 "        // the trailer's unused bytes
+                             "03 01 "                    // widths of offsets and references
+                             "00 00 00 00 00 00 00 01 "  // objects
+                             "00 00 00 00 00 00 00 00 "  // the root's number
+                             "00 00 00 00 00 00 00 09 "; // where the table begins
+    EXPECT_EQ(readOf(hex(list)), "left");
+}
+
 TEST(BinaryCellReaderTest, TakesListsOfUpTo65536Bytes) {
     // Magic 8, array 1, padding, one offset of two bytes, trailer 32.
     EXPECT_EQ(readOf(listOf({hex("A0")}, {.offsetWidth = 2, .padding = 65536 - 43})), "");

@@ -54,6 +54,8 @@ TEST(NumberFormatTest, ShowsEveryPartOfAUnitAsPrintfDoes) {
         EXPECT_EQ(realText("%.0f", value), printed("%.0f"));
         EXPECT_EQ(realText("%.1f", value), printed("%.1f"));
         EXPECT_EQ(realText("%.2f", value), printed("%.2f"));
+        EXPECT_EQ(realText("%.4f", value), printed("%.4f"));
+        EXPECT_EQ(realText("%.5f", value), printed("%.5f"));
         EXPECT_EQ(realText("%f", value), printed("%f"));
         EXPECT_EQ(realText("%.7f", value), printed("%.7f"));
         EXPECT_EQ(realText("%+9.3f", value), printed("%+9.3f"));
