@@ -10,6 +10,7 @@ namespace {
 
 /// For kept keys; a multiple of what the parsers have, so that few places are asked for by two.
 constexpr std::size_t places = 256;
+/// With so many all are forgotten, so that an empty place is never far. The parsers have a few dozen.
 constexpr std::size_t mostKeys = places / 2;
 
 bool isSameConstant(std::string_view a, std::string_view b) {

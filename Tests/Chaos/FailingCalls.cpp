@@ -15,9 +15,9 @@
 // event loop's own descriptors are not: what becomes of a connection is tried by killing the other end. Nor
 // are those of standard error, which is where the program is to tell of the failure. Memory that Qt asks the
 // C library for by itself is left alone: it does not look whether it got it (QObject::connect does not), so
-// that nothing above it could. What it gets with `new` is counted, but for the one allocation of a
-// QWaitCondition: in its record of the main thread, Qt's clean-up after that failure follows a pointer that
-// is not set yet. It happens while the event loop is made, before a program has opened anything.
+// that nothing above it could. What it gets with `new` is counted, but for what a QWaitCondition consists of:
+// Qt's record of a thread has one, and its clean-up after that failure follows a pointer that is not set yet.
+// For the main thread this is while the event loop is made, before a program has opened anything.
 
 // The fortified headers define some of these themselves.
 #undef _FORTIFY_SOURCE

@@ -53,7 +53,7 @@ protected:
         _resources.put(resource, "plist", shippedResource(resource + ".plist"));
         const auto scenario = scenarioKindNamed(GetParam().scenario)->make(1);
         decoder = LogGenerator::generatorFromTechnology(scenario->technology(), _clock);
-        // Which keeps the messages themselves.
+        // The history keeps the messages themselves, which are no update of a section.
         decoder->setKeepsHistory(false);
         messages.resize(10000);
         for (Data& message : messages)
