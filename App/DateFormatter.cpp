@@ -1,4 +1,5 @@
 #include "App/DateFormatter.h"
+#include "Platform/DateText.h"
 
 #include <cstddef>
 #include <string_view>

@@ -2,10 +2,10 @@
 
 #include "App/AppPlatform.h"
 #include "Platform/Clock.h"
-#include "Platform/Linux/LinuxFileSystem.h"
-#include "Platform/Linux/LinuxMessagePorts.h"
-#include "Platform/Linux/LinuxPreferences.h"
-#include "Platform/Linux/LinuxTelephonyService.h"
+#include "Platform/Linux/Files/LinuxFileSystem.h"
+#include "Platform/Linux/Files/LinuxPreferences.h"
+#include "Platform/Linux/Ports/LinuxMessagePorts.h"
+#include "Platform/Linux/Ports/LinuxTelephonyService.h"
 #include "Platform/Linux/QtMainQueue.h"
 #include "Platform/SystemLog.h"
 

@@ -3,8 +3,8 @@
 #include "App/VelmoraPaneController.h"
 #include "App/VelmoraSaveViewController.h"
 #include "Platform/SystemLog.h"
-#include "Toolkit/NavigationController.h"
-#include "Toolkit/TableView.h"
+#include "Toolkit/Navigation/NavigationController.h"
+#include "Toolkit/Tables/TableView.h"
 
 namespace velmora {
 

@@ -3,7 +3,7 @@
 #include "App/VelmoraPaneController.h"
 #include "App/VelmoraSaveViewController.h"
 #include "Model/NodePath.h"
-#include "Toolkit/NavigationController.h"
+#include "Toolkit/Navigation/NavigationController.h"
 #include "Toolkit/Screen.h"
 #include "Toolkit/Window.h"
 

@@ -5,7 +5,7 @@
 #include "Model/VelmoraModel.h"
 #include "Toolkit/Application.h"
 #include "Toolkit/ApplicationDelegate.h"
-#include "Toolkit/NavigationControllerDelegate.h"
+#include "Toolkit/Navigation/NavigationControllerDelegate.h"
 
 #include <functional>
 #include <memory>

@@ -2,7 +2,7 @@
 
 #include "Toolkit/Label.h"
 #include "Toolkit/ScrollView.h"
-#include "Toolkit/TableCell.h"
+#include "Toolkit/Tables/TableCell.h"
 
 #include <memory>
 #include <string>

@@ -3,11 +3,11 @@
 #include "App/VelmoraApp.h"
 #include "App/VelmoraCell.h"
 #include "Model/NodePath.h"
+#include "Toolkit/Bars/FlexibleSpace.h"
+#include "Toolkit/Bars/LabelItem.h"
+#include "Toolkit/Bars/SaveButton.h"
 #include "Toolkit/BusyIndicator.h"
-#include "Toolkit/FlexibleSpace.h"
-#include "Toolkit/LabelItem.h"
-#include "Toolkit/NavigationController.h"
-#include "Toolkit/SaveButton.h"
+#include "Toolkit/Navigation/NavigationController.h"
 
 #include <memory>
 #include <utility>

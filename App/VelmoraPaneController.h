@@ -1,7 +1,7 @@
 #pragma once
 
 #include "Model/VelmoraModelNode.h"
-#include "Toolkit/TableViewController.h"
+#include "Toolkit/Tables/TableViewController.h"
 
 #include <optional>
 #include <string>

@@ -2,7 +2,7 @@
 
 #include "Toolkit/Button.h"
 #include "Toolkit/Label.h"
-#include "Toolkit/TableView.h"
+#include "Toolkit/Tables/TableView.h"
 #include "Toolkit/TextField.h"
 #include "Toolkit/View.h"
 

@@ -3,11 +3,11 @@
 #include "App/VelmoraApp.h"
 #include "App/VelmoraSaveView.h"
 #include "Model/Snapshot.h"
-#include "Platform/PropertyList.h"
 #include "Platform/SystemLog.h"
+#include "PropertyLists/PropertyList.h"
 #include "Toolkit/Alert.h"
 #include "Toolkit/Screen.h"
-#include "Toolkit/TableCell.h"
+#include "Toolkit/Tables/TableCell.h"
 
 #include <chrono>
 #include <new>

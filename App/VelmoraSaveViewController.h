@@ -1,13 +1,13 @@
 #pragma once
 
 #include "Platform/Clock.h"
-#include "Platform/Value.h"
-#include "Toolkit/TableView.h"
-#include "Toolkit/TableViewDataSource.h"
-#include "Toolkit/TableViewDelegate.h"
+#include "PropertyLists/Value.h"
+#include "Toolkit/Navigation/ViewController.h"
+#include "Toolkit/Tables/TableView.h"
+#include "Toolkit/Tables/TableViewDataSource.h"
+#include "Toolkit/Tables/TableViewDelegate.h"
 #include "Toolkit/TextField.h"
 #include "Toolkit/TextFieldDelegate.h"
-#include "Toolkit/ViewController.h"
 
 #include <memory>
 #include <string>

@@ -1,13 +1,13 @@
 #include "Platform/Console.h"
-#include "Platform/Linux/FileResources.h"
+#include "Platform/Linux/Files/FileResources.h"
 #include "Platform/TelephonyService.h"
 #include "Recording/MessageReader.h"
-#include "Telephony/ScenarioRegistry.h"
-#include "Tools/DecodeWriter.h"
-#include "Tools/JSONText.h"
+#include "Telephony/Drives/ScenarioRegistry.h"
+#include "Tools/Decode/DecodeWriter.h"
 #include "Tools/Output.h"
 #include "Tools/Report.h"
-#include "Tools/TimeText.h"
+#include "Tools/Text/JSONText.h"
+#include "Tools/Text/TimeText.h"
 
 #include <benchmark/benchmark.h>
 

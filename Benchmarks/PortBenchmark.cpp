@@ -1,5 +1,5 @@
-#include "Platform/Linux/LinuxMessagePorts.h"
 #include "Platform/Linux/MainLoop.h"
+#include "Platform/Linux/Ports/LinuxMessagePorts.h"
 
 #include <benchmark/benchmark.h>
 #include <sys/wait.h>

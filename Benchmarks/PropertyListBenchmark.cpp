@@ -1,6 +1,6 @@
 // How long the property lists take that arrive with log messages: the SIM files and the cell information.
 
-#include "Platform/PropertyList.h"
+#include "PropertyLists/PropertyList.h"
 
 #include <benchmark/benchmark.h>
 

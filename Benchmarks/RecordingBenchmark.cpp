@@ -1,6 +1,6 @@
-#include "Recording/DescriptorFile.h"
-#include "Recording/RecordingReader.h"
-#include "Recording/RecordingWriter.h"
+#include "Recording/Files/DescriptorFile.h"
+#include "Recording/Pcapng/RecordingReader.h"
+#include "Recording/Pcapng/RecordingWriter.h"
 
 #include <algorithm>
 #include <chrono>

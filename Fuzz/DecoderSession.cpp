@@ -1,7 +1,7 @@
 #include "Fuzz/DecoderSession.h"
 
-#include "LogGenerator/AssertionFailure.h"
-#include "LogGenerator/ExtraPayload.h"
+#include "LogGenerator/Extra/ExtraPayload.h"
+#include "LogGenerator/GSM/AssertionFailure.h"
 #include "Tests/Support/ShippedResources.h"
 
 namespace velmora {

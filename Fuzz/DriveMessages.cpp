@@ -1,7 +1,7 @@
 #include "Fuzz/DriveMessages.h"
 
-#include "Recording/RecordHeader.h"
-#include "Telephony/ScenarioRegistry.h"
+#include "LogMessages/RecordHeader.h"
+#include "Telephony/Drives/ScenarioRegistry.h"
 
 #include <map>
 #include <tuple>

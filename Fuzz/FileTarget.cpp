@@ -1,7 +1,7 @@
 #include "Fuzz/FuzzTargets.h"
-#include "Recording/DLFReader.h"
-#include "Recording/RecordingReader.h"
-#include "Recording/SnapshotReader.h"
+#include "Recording/DLF/DLFReader.h"
+#include "Recording/Pcapng/RecordingReader.h"
+#include "Recording/Snapshots/SnapshotReader.h"
 #include "Tests/Recording/PcapngFile.h"
 
 #include <algorithm>

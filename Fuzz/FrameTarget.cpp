@@ -1,5 +1,5 @@
 #include "Fuzz/FuzzTargets.h"
-#include "Platform/Linux/FrameReader.h"
+#include "Platform/Linux/Ports/FrameReader.h"
 
 #include <algorithm>
 #include <string>

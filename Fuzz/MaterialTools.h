@@ -1,6 +1,6 @@
 #pragma once
 
-#include "Platform/PropertyList.h"
+#include "PropertyLists/PropertyList.h"
 
 #include <span>
 #include <stdexcept>

@@ -1,6 +1,6 @@
 #include "Fuzz/MessageScript.h"
 
-#include "Recording/RecordHeader.h"
+#include "LogMessages/RecordHeader.h"
 
 #include <algorithm>
 #include <array>

@@ -2,8 +2,8 @@
 #include "Fuzz/DriveMessages.h"
 #include "Fuzz/FuzzMaterials.h"
 #include "Fuzz/MaterialTools.h"
-#include "Recording/RecordHeader.h"
-#include "Tests/Platform/PropertyListSamples.h"
+#include "LogMessages/RecordHeader.h"
+#include "Tests/PropertyLists/PropertyListSamples.h"
 
 namespace velmora {
 

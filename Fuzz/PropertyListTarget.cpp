@@ -1,6 +1,6 @@
 #include "Fuzz/FuzzTargets.h"
 #include "Fuzz/SameValue.h"
-#include "Platform/PropertyList.h"
+#include "PropertyLists/PropertyList.h"
 
 #include <string>
 

@@ -2,7 +2,7 @@
 #include "Fuzz/FuzzTargets.h"
 #include "Fuzz/MessageScript.h"
 #include "Fuzz/SameValue.h"
-#include "Recording/RecordHeader.h"
+#include "LogMessages/RecordHeader.h"
 
 #include <algorithm>
 #include <array>

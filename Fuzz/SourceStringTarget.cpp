@@ -1,5 +1,5 @@
 #include "Fuzz/FuzzTargets.h"
-#include "Telephony/SourceString.h"
+#include "Telephony/Sources/SourceString.h"
 
 #include <array>
 #include <charconv>

@@ -1,8 +1,8 @@
 #include "Fuzz/DriveMessages.h"
 #include "Fuzz/FuzzMaterials.h"
 #include "Fuzz/MaterialTools.h"
-#include "Platform/Linux/Frame.h"
-#include "Recording/Pcapng.h"
+#include "Platform/Linux/Ports/Frame.h"
+#include "Recording/Pcapng/Pcapng.h"
 #include "Tests/Recording/PcapngFile.h"
 #include "Tests/Support/Hex.h"
 

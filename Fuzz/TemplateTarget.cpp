@@ -2,7 +2,7 @@
 #include "Fuzz/DriveMessages.h"
 #include "Fuzz/FuzzTargets.h"
 #include "Model/VelmoraModelNode.h"
-#include "Platform/PropertyList.h"
+#include "PropertyLists/PropertyList.h"
 
 #include <array>
 #include <string>

@@ -1,9 +1,9 @@
 #pragma once
 
-#include "LogGenerator/CellList.h"
-#include "LogGenerator/Field.h"
-#include "LogGenerator/Record.h"
-#include "Platform/Value.h"
+#include "LogGenerator/Extra/CellList.h"
+#include "LogGenerator/Fields/Field.h"
+#include "LogMessages/Record.h"
+#include "PropertyLists/Value.h"
 
 #include <cstdint>
 #include <functional>

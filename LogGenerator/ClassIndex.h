@@ -1,7 +1,7 @@
 #pragma once
 
 #include "LogGenerator/Base.h"
-#include "LogGenerator/CellList.h"
+#include "LogGenerator/Extra/CellList.h"
 
 #include <memory>
 #include <string>

@@ -6,6 +6,7 @@
 #include "LogGenerator/MessageEffects.h"
 #include "LogGenerator/OstrelGSM/Ostrel_GSMLogGenerator.h"
 #include "LogGenerator/UTRAN/UTRANLogGenerator.h"
+#include "Platform/DateText.h"
 #include "Platform/SystemLog.h"
 #include "Platform/TelephonyService.h"
 

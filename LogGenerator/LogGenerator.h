@@ -1,7 +1,7 @@
 #pragma once
 
 #include "Platform/Clock.h"
-#include "Platform/Value.h"
+#include "PropertyLists/Value.h"
 
 #include <memory>
 #include <string_view>

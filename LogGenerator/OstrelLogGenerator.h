@@ -1,7 +1,7 @@
 #pragma once
 
 #include "LogGenerator/LogGenerator.h"
-#include "Platform/DLFVersionReport.h"
+#include "LogMessages/DLFVersionReport.h"
 
 #include <cstdint>
 #include <optional>

@@ -1,9 +1,9 @@
 #include "LogGenerator/OstrelLogGenerator2.h"
 
 #include "LogGenerator/MessageEffects.h"
-#include "Platform/PropertyList.h"
 #include "Platform/Resources.h"
 #include "Platform/SystemLog.h"
+#include "PropertyLists/PropertyList.h"
 
 #include <algorithm>
 #include <charconv>

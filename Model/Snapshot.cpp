@@ -1,4 +1,5 @@
 #include "Model/Snapshot.h"
+#include "Platform/DateText.h"
 
 namespace velmora {
 

@@ -1,7 +1,7 @@
 #include "Model/VelmoraModel.h"
 
-#include "Platform/PropertyList.h"
 #include "Platform/SystemLog.h"
+#include "PropertyLists/PropertyList.h"
 
 #include <chrono>
 

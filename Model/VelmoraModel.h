@@ -6,7 +6,7 @@
 #include "Platform/MainQueue.h"
 #include "Platform/MessagePort.h"
 #include "Platform/TelephonyService.h"
-#include "Platform/Value.h"
+#include "PropertyLists/Value.h"
 
 #include <functional>
 #include <memory>

@@ -1,9 +1,9 @@
 #include "Recording/OpenMessages.h"
 
-#include "Recording/DLFReader.h"
-#include "Recording/FileSource.h"
-#include "Recording/RecordingReader.h"
-#include "Recording/SnapshotReader.h"
+#include "Recording/DLF/DLFReader.h"
+#include "Recording/Files/FileSource.h"
+#include "Recording/Pcapng/RecordingReader.h"
+#include "Recording/Snapshots/SnapshotReader.h"
 
 #include <algorithm>
 #include <string_view>

@@ -1,7 +1,7 @@
 #pragma once
 
 #include "Platform/Result.h"
-#include "Recording/ChunkedInput.h"
+#include "Recording/Files/ChunkedInput.h"
 #include "Recording/MessageReader.h"
 
 #include <memory>

@@ -1,15 +1,15 @@
 #include "Platform/Clock.h"
-#include "Platform/Linux/LinuxMessagePorts.h"
 #include "Platform/Linux/MainLoop.h"
+#include "Platform/Linux/Ports/LinuxMessagePorts.h"
 #include "Platform/Linux/ProgramLog.h"
 #include "Platform/Linux/QtMainQueue.h"
 #include "Platform/Linux/ServiceManager.h"
 #include "Platform/Linux/SignalWatcher.h"
 #include "Platform/Linux/Termination.h"
 #include "Platform/SystemLog.h"
-#include "Telephony/LogServer.h"
-#include "Telephony/SourceFactory.h"
-#include "Telephony/SourceString.h"
+#include "Telephony/Service/LogServer.h"
+#include "Telephony/Sources/SourceFactory.h"
+#include "Telephony/Sources/SourceString.h"
 
 #include <CLI/CLI.hpp>
 

@@ -1,7 +1,7 @@
 #include "Toolkit/Window.h"
 
+#include "Toolkit/Navigation/ViewController.h"
 #include "Toolkit/View.h"
-#include "Toolkit/ViewController.h"
 #include "Toolkit/Widgets/Conversions.h"
 #include "Toolkit/Widgets/WindowWidget.h"
 

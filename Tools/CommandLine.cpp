@@ -1,7 +1,7 @@
 #include "Tools/CommandLine.h"
 
 #include "Platform/TelephonyService.h"
-#include "Tools/Conversion.h"
+#include "Tools/Convert/Conversion.h"
 #include "Tools/ExitStatus.h"
 #include "Tools/Technologies.h"
 

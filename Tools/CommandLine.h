@@ -2,11 +2,11 @@
 
 #include "Platform/Linux/ProgramLog.h"
 #include "Platform/SystemLog.h"
-#include "Tools/ConvertCommand.h"
-#include "Tools/DecodeCommand.h"
-#include "Tools/InfoCommand.h"
-#include "Tools/RecordCommand.h"
-#include "Tools/WatchCommand.h"
+#include "Tools/Convert/ConvertCommand.h"
+#include "Tools/Decode/DecodeCommand.h"
+#include "Tools/Info/InfoCommand.h"
+#include "Tools/Record/RecordCommand.h"
+#include "Tools/Watch/WatchCommand.h"
 
 #include <string>
 #include <variant>

@@ -1,9 +1,9 @@
 #pragma once
 
 #include "Model/VelmoraModel.h"
-#include "Platform/Linux/LinuxMessagePorts.h"
-#include "Platform/Linux/LinuxTelephonyService.h"
 #include "Platform/Linux/MainLoop.h"
+#include "Platform/Linux/Ports/LinuxMessagePorts.h"
+#include "Platform/Linux/Ports/LinuxTelephonyService.h"
 #include "Platform/Linux/QtMainQueue.h"
 
 namespace velmora {

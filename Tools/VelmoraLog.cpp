@@ -1,7 +1,7 @@
 #include "Tools/VelmoraLog.h"
 
 #include "Platform/Console.h"
-#include "Platform/Linux/FileResources.h"
+#include "Platform/Linux/Files/FileResources.h"
 #include "Tools/CommandLine.h"
 #include "Tools/ExitStatus.h"
 #include "Tools/Output.h"

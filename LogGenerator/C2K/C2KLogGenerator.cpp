@@ -2,9 +2,9 @@
 
 #include "LogGenerator/C2K/LogCodeParsers.h"
 #include "LogGenerator/MessageEffects.h"
-#include "Platform/PropertyList.h"
 #include "Platform/Resources.h"
 #include "Platform/SystemLog.h"
+#include "PropertyLists/PropertyList.h"
 
 namespace velmora {
 

@@ -1,7 +1,7 @@
 #pragma once
 
 #include "LogGenerator/C2K/Publisher.h"
-#include "LogGenerator/Record.h"
+#include "LogMessages/Record.h"
 
 #include <cstdint>
 #include <string_view>

@@ -1,13 +1,13 @@
 #include "LogGenerator/C2K/LogCodeParsers.h"
 
-#include "LogGenerator/C2K/ActiveSetPilots.h"
-#include "LogGenerator/C2K/EVDOStatus.h"
-#include "LogGenerator/C2K/FingerC2I.h"
-#include "LogGenerator/C2K/ForwardLinkDataRate.h"
-#include "LogGenerator/C2K/OneXStatus.h"
-#include "LogGenerator/C2K/ReverseLinkDataRate.h"
-#include "LogGenerator/C2K/SystemIdentification.h"
-#include "LogGenerator/C2K/TrafficFER.h"
+#include "LogGenerator/C2K/EVDO/ActiveSetPilots.h"
+#include "LogGenerator/C2K/EVDO/EVDOStatus.h"
+#include "LogGenerator/C2K/EVDO/FingerC2I.h"
+#include "LogGenerator/C2K/EVDO/ForwardLinkDataRate.h"
+#include "LogGenerator/C2K/EVDO/ReverseLinkDataRate.h"
+#include "LogGenerator/C2K/OneX/OneXStatus.h"
+#include "LogGenerator/C2K/OneX/SystemIdentification.h"
+#include "LogGenerator/C2K/OneX/TrafficFER.h"
 
 #include <algorithm>
 #include <array>

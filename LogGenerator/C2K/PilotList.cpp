@@ -1,6 +1,6 @@
 #include "LogGenerator/C2K/PilotList.h"
 
-#include "LogGenerator/NumberFormat.h"
+#include "LogGenerator/Fields/NumberFormat.h"
 
 #include <cmath>
 

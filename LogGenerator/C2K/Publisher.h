@@ -2,7 +2,7 @@
 
 #include "LogGenerator/C2K/Targets.h"
 #include "Platform/Bytes.h"
-#include "Platform/Value.h"
+#include "PropertyLists/Value.h"
 
 #include <string_view>
 

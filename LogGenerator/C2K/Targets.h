@@ -1,7 +1,7 @@
 #pragma once
 
 #include "LogGenerator/C2K/ValueField.h"
-#include "Platform/Value.h"
+#include "PropertyLists/Value.h"
 
 #include <cstddef>
 #include <cstdint>

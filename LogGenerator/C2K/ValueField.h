@@ -1,7 +1,7 @@
 #pragma once
 
 #include "LogGenerator/C2K/NumberedTexts.h"
-#include "LogGenerator/Field.h"
+#include "LogGenerator/Fields/Field.h"
 
 #include <algorithm>
 #include <cstddef>

@@ -1,7 +1,7 @@
 #include "LogGenerator/GSM/GSMLogGenerator.h"
 
-#include "LogGenerator/AssertionFailure.h"
-#include "Platform/PropertyList.h"
+#include "LogGenerator/GSM/AssertionFailure.h"
+#include "PropertyLists/PropertyList.h"
 
 namespace velmora {
 

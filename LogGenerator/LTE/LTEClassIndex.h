@@ -1,6 +1,8 @@
 #pragma once
 
 #include "LogGenerator/ClassIndex.h"
+#include "LogGenerator/Extra/PDPContextList.h"
+#include "LogGenerator/Extra/SimInfo.h"
 #include "LogGenerator/LTE/ConnectedModeMeasurementMisc.h"
 #include "LogGenerator/LTE/DetectedCells.h"
 #include "LogGenerator/LTE/LTEServingCellInfo.h"
@@ -10,8 +12,6 @@
 #include "LogGenerator/LTE/ReselectionCandidatesList.h"
 #include "LogGenerator/LTE/ReselectionCandidatesMisc.h"
 #include "LogGenerator/LTE/ServingCellMeasurement.h"
-#include "LogGenerator/PDPContextList.h"
-#include "LogGenerator/SimInfo.h"
 
 namespace velmora {
 

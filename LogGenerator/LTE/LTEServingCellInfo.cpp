@@ -1,6 +1,6 @@
 #include "LogGenerator/LTE/LTEServingCellInfo.h"
 
-#include "LogGenerator/CellFields.h"
+#include "LogGenerator/Extra/CellFields.h"
 #include "Platform/SystemLog.h"
 #include "Platform/TelephonyService.h"
 

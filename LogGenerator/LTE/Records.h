@@ -1,6 +1,6 @@
 #pragma once
 
-#include "LogGenerator/Field.h"
+#include "LogGenerator/Fields/Field.h"
 
 #include <cstdint>
 

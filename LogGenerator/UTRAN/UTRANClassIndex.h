@@ -1,8 +1,8 @@
 #pragma once
 
 #include "LogGenerator/ClassIndex.h"
-#include "LogGenerator/PDPContextList.h"
-#include "LogGenerator/SimInfo.h"
+#include "LogGenerator/Extra/PDPContextList.h"
+#include "LogGenerator/Extra/SimInfo.h"
 #include "LogGenerator/UTRAN/CCTRCHSIRMeasurement.h"
 #include "LogGenerator/UTRAN/GSMNeighbhorMeasurements.h"
 #include "LogGenerator/UTRAN/RRC_State.h"

@@ -1,7 +1,7 @@
 #include "Platform/Linux/ServiceManager.h"
 
 #include "Platform/Linux/Errno.h"
-#include "Platform/Linux/FileDescriptor.h"
+#include "Platform/Linux/Files/FileDescriptor.h"
 #include "Platform/SystemLog.h"
 
 #include <sys/socket.h>

@@ -1,7 +1,7 @@
 #include "Platform/Linux/ServiceStarter.h"
 
-#include "Platform/Linux/EnvironmentPath.h"
-#include "Platform/Linux/LinuxRemotePort.h"
+#include "Platform/Linux/Files/EnvironmentPath.h"
+#include "Platform/Linux/Ports/LinuxRemotePort.h"
 #include "Platform/SystemLog.h"
 #include "Platform/TelephonyService.h"
 

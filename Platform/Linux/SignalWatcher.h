@@ -1,7 +1,7 @@
 #pragma once
 
-#include "Platform/Linux/FileDescriptor.h"
-#include "Platform/Linux/SocketWatch.h"
+#include "Platform/Linux/Files/FileDescriptor.h"
+#include "Platform/Linux/Ports/SocketWatch.h"
 
 #include <csignal>
 #include <functional>

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "Platform/Value.h"
+#include "PropertyLists/Value.h"
 
 #include <cstdint>
 #include <span>

@@ -1,6 +1,6 @@
 #include "Telephony/ModemManager/MemberText.h"
 
-#include "Platform/Clock.h"
+#include "Platform/DateText.h"
 #include "Platform/UTF8.h"
 #include "Telephony/ModemManager/MemberNumber.h"
 

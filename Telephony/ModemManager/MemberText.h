@@ -1,6 +1,6 @@
 #pragma once
 
-#include "Platform/Value.h"
+#include "PropertyLists/Value.h"
 
 /// How a member of ModemManager's becomes text for people: SIM files and the values of a bearer. As with the
 /// numbers, each function gives none for a member that is missing, of another type than ModemManager

@@ -1,7 +1,7 @@
 #pragma once
 
 #include "Platform/Result.h"
-#include "Platform/Value.h"
+#include "PropertyLists/Value.h"
 
 #include <QVariantList>
 

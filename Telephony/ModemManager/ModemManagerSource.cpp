@@ -2,8 +2,8 @@
 
 #include "Platform/SystemLog.h"
 #include "Platform/TelephonyService.h"
+#include "Telephony/Drives/ServiceRecords.h"
 #include "Telephony/ModemManager/ModemReport.h"
-#include "Telephony/ServiceRecords.h"
 
 #include <string>
 #include <utility>

@@ -2,10 +2,10 @@
 
 #include "Platform/Clock.h"
 #include "Platform/MainQueue.h"
-#include "Telephony/LogSource.h"
+#include "Telephony/Drives/RecordBuilder.h"
 #include "Telephony/ModemManager/ModemFollower.h"
 #include "Telephony/ModemManager/ModemSession.h"
-#include "Telephony/RecordBuilder.h"
+#include "Telephony/Sources/LogSource.h"
 
 #include <functional>
 #include <memory>

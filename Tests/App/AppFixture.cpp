@@ -1,9 +1,9 @@
 #include "Tests/App/AppFixture.h"
 
-#include "Platform/PropertyList.h"
+#include "PropertyLists/PropertyList.h"
+#include "Toolkit/Bars/LabelItem.h"
+#include "Toolkit/Bars/SaveButton.h"
 #include "Toolkit/BusyIndicator.h"
-#include "Toolkit/LabelItem.h"
-#include "Toolkit/SaveButton.h"
 
 #include <QApplication>
 #include <QLabel>

@@ -4,7 +4,7 @@
 #include "App/VelmoraCell.h"
 #include "App/VelmoraPaneController.h"
 #include "App/VelmoraSaveViewController.h"
-#include "Platform/Linux/LinuxFileSystem.h"
+#include "Platform/Linux/Files/LinuxFileSystem.h"
 #include "Tests/Support/CapturedLog.h"
 #include "Tests/Support/FakeClock.h"
 #include "Tests/Support/FakeMainQueue.h"
@@ -13,8 +13,8 @@
 #include "Tests/Support/FakeResources.h"
 #include "Tests/Support/FakeTelephonyService.h"
 #include "Tests/Support/TemporaryDirectory.h"
-#include "Toolkit/NavigationController.h"
-#include "Toolkit/TableView.h"
+#include "Toolkit/Navigation/NavigationController.h"
+#include "Toolkit/Tables/TableView.h"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>

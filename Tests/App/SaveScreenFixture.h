@@ -2,8 +2,8 @@
 
 #include "Tests/App/AppFixture.h"
 
-#include "Platform/Linux/Files.h"
-#include "Platform/PropertyList.h"
+#include "Platform/Linux/Files/Files.h"
+#include "PropertyLists/PropertyList.h"
 
 #include <algorithm>
 #include <chrono>

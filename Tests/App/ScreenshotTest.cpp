@@ -1,6 +1,6 @@
-#include "Platform/Linux/FileResources.h"
+#include "Platform/Linux/Files/FileResources.h"
 #include "Platform/Resources.h"
-#include "Telephony/SourceFactory.h"
+#include "Telephony/Sources/SourceFactory.h"
 #include "Tests/App/AppFixture.h"
 
 #include <QApplication>

@@ -1,9 +1,9 @@
 #include "Tests/App/AppFixture.h"
 
+#include "Toolkit/Bars/FlexibleSpace.h"
+#include "Toolkit/Bars/LabelItem.h"
+#include "Toolkit/Bars/SaveButton.h"
 #include "Toolkit/BusyIndicator.h"
-#include "Toolkit/FlexibleSpace.h"
-#include "Toolkit/LabelItem.h"
-#include "Toolkit/SaveButton.h"
 
 #include <QTest>
 #include <QWidget>

@@ -1,8 +1,8 @@
 #include "App/LinuxAppPlatform.h"
 #include "App/VelmoraApp.h"
 #include "Platform/Console.h"
-#include "Platform/Linux/FileResources.h"
-#include "Platform/Linux/LargeMemory.h"
+#include "Platform/Linux/Files/FileResources.h"
+#include "Platform/Linux/Files/LargeMemory.h"
 #include "Platform/Linux/ProgramLog.h"
 #include "Platform/Linux/Termination.h"
 

@@ -1,8 +1,8 @@
 #include "LogGenerator/ClassIndex.h"
 
-#include "LogGenerator/OstrelGSM/ProcessCS.h"
-#include "LogGenerator/PDPContextList.h"
-#include "LogGenerator/SimInfo.h"
+#include "LogGenerator/Extra/PDPContextList.h"
+#include "LogGenerator/Extra/SimInfo.h"
+#include "LogGenerator/OstrelGSM/Registration/ProcessCS.h"
 #include "Tests/LogGenerator/ClassIndexTesting.h"
 
 #include <gmock/gmock.h>

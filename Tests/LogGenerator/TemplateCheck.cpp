@@ -1,6 +1,6 @@
 #include "Tests/LogGenerator/TemplateCheck.h"
 
-#include "Platform/PropertyList.h"
+#include "PropertyLists/PropertyList.h"
 #include "Tests/Support/ShippedResources.h"
 
 #include <gmock/gmock.h>

@@ -1,7 +1,7 @@
 #pragma once
 
 #include "LogGenerator/ClassIndex.h"
-#include "Platform/Value.h"
+#include "PropertyLists/Value.h"
 
 #include <functional>
 #include <set>

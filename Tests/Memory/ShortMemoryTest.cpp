@@ -1,4 +1,4 @@
-#include "Platform/Value.h"
+#include "PropertyLists/Value.h"
 #include "Tests/Memory/Allocations.h"
 
 #include <gtest/gtest.h>

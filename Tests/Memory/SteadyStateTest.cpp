@@ -1,6 +1,6 @@
 #include "LogGenerator/LogGenerator.h"
 #include "Platform/SystemLog.h"
-#include "Telephony/ScenarioRegistry.h"
+#include "Telephony/Drives/ScenarioRegistry.h"
 #include "Tests/Memory/Allocations.h"
 #include "Tests/Support/FakeClock.h"
 #include "Tests/Support/FakeResources.h"

@@ -1,7 +1,7 @@
 #pragma once
 
 #include "Model/VelmoraModel.h"
-#include "Platform/PropertyList.h"
+#include "PropertyLists/PropertyList.h"
 #include "Tests/Support/CapturedLog.h"
 #include "Tests/Support/FakeClock.h"
 #include "Tests/Support/FakeMainQueue.h"

@@ -1,10 +1,10 @@
 #include "Tests/Model/SocketService.h"
 
-#include "Platform/Linux/LinuxMessagePorts.h"
 #include "Platform/Linux/MainLoop.h"
+#include "Platform/Linux/Ports/LinuxMessagePorts.h"
 #include "Platform/Linux/QtMainQueue.h"
-#include "Platform/PropertyList.h"
 #include "Platform/TelephonyService.h"
+#include "PropertyLists/PropertyList.h"
 #include "Tests/Support/Hex.h"
 
 #include <csignal>

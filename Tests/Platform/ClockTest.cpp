@@ -1,4 +1,4 @@
-#include "Platform/Clock.h"
+#include "Platform/DateText.h"
 #include "Tests/Support/FakeClock.h"
 
 #include <gtest/gtest.h>

@@ -1,6 +1,6 @@
-#include "Platform/Linux/FileDraft.h"
+#include "Platform/Linux/Files/FileDraft.h"
 
-#include "Platform/Linux/Files.h"
+#include "Platform/Linux/Files/Files.h"
 #include "Tests/Support/TemporaryDirectory.h"
 
 #include <gmock/gmock.h>

@@ -1,5 +1,5 @@
-#include "Platform/Linux/LinuxFileSystem.h"
-#include "Platform/Linux/Files.h"
+#include "Platform/Linux/Files/LinuxFileSystem.h"
+#include "Platform/Linux/Files/Files.h"
 #include "Tests/Support/TemporaryDirectory.h"
 
 #include <gmock/gmock.h>

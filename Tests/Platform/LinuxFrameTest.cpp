@@ -1,6 +1,6 @@
-#include "Platform/Linux/FileDescriptor.h"
-#include "Platform/Linux/FrameQueue.h"
-#include "Platform/Linux/FrameReader.h"
+#include "Platform/Linux/Files/FileDescriptor.h"
+#include "Platform/Linux/Ports/FrameQueue.h"
+#include "Platform/Linux/Ports/FrameReader.h"
 #include "Tests/Support/Hex.h"
 
 #include <gmock/gmock.h>

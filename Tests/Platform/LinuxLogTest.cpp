@@ -1,4 +1,4 @@
-#include "Platform/Linux/FileDescriptor.h"
+#include "Platform/Linux/Files/FileDescriptor.h"
 #include "Platform/Linux/ProgramLog.h"
 #include "Platform/Linux/StderrLog.h"
 #include "Platform/Linux/SyslogLog.h"

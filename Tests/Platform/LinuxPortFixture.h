@@ -1,8 +1,8 @@
 #pragma once
 
-#include "Platform/Linux/FileDescriptor.h"
-#include "Platform/Linux/LinuxMessagePorts.h"
+#include "Platform/Linux/Files/FileDescriptor.h"
 #include "Platform/Linux/MainLoop.h"
+#include "Platform/Linux/Ports/LinuxMessagePorts.h"
 #include "Tests/Support/CapturedLog.h"
 #include "Tests/Support/Hex.h"
 #include "Tests/Support/TemporaryDirectory.h"

@@ -1,5 +1,5 @@
-#include "Platform/Linux/FileResources.h"
-#include "Platform/Linux/Files.h"
+#include "Platform/Linux/Files/FileResources.h"
+#include "Platform/Linux/Files/Files.h"
 #include "Tests/Support/Hex.h"
 #include "Tests/Support/TemporaryDirectory.h"
 

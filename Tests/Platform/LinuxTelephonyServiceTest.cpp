@@ -1,5 +1,5 @@
-#include "Platform/Linux/LinuxTelephonyService.h"
-#include "Platform/PropertyList.h"
+#include "Platform/Linux/Ports/LinuxTelephonyService.h"
+#include "PropertyLists/PropertyList.h"
 #include "Tests/Platform/LinuxPortFixture.h"
 #include "Tests/Support/FakeMessagePorts.h"
 

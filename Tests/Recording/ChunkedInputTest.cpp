@@ -1,4 +1,4 @@
-#include "Recording/ChunkedInput.h"
+#include "Recording/Files/ChunkedInput.h"
 
 #include "Tests/Recording/PcapngFile.h"
 

@@ -1,4 +1,4 @@
-#include "Recording/DLFReader.h"
+#include "Recording/DLF/DLFReader.h"
 
 #include "Tests/Recording/LogFile.h"
 

@@ -1,4 +1,4 @@
-#include "Recording/DLFWriter.h"
+#include "Recording/DLF/DLFWriter.h"
 
 #include "Tests/Recording/FakeRecordingFile.h"
 #include "Tests/Recording/LogFile.h"

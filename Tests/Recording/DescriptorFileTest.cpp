@@ -1,4 +1,4 @@
-#include "Recording/DescriptorFile.h"
+#include "Recording/Files/DescriptorFile.h"
 
 #include "Tests/Support/Hex.h"
 #include "Tests/Support/TemporaryDirectory.h"

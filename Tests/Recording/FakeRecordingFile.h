@@ -1,6 +1,6 @@
 #pragma once
 
-#include "Recording/RecordingFile.h"
+#include "Recording/Pcapng/RecordingFile.h"
 
 #include <algorithm>
 #include <cerrno>

@@ -1,4 +1,4 @@
-#include "Recording/InterfaceDescription.h"
+#include "Recording/Pcapng/InterfaceDescription.h"
 
 #include "Tests/Support/Hex.h"
 

@@ -1,8 +1,8 @@
 #include "Tests/Recording/LogFile.h"
 
-#include "Platform/PropertyList.h"
+#include "LogMessages/RecordTime.h"
+#include "PropertyLists/PropertyList.h"
 #include "Recording/OpenMessages.h"
-#include "Recording/RecordTime.h"
 #include "Tests/Support/FakeClock.h"
 
 #include <memory>

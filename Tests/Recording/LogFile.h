@@ -1,6 +1,6 @@
 #pragma once
 
-#include "Platform/Value.h"
+#include "PropertyLists/Value.h"
 #include "Recording/MessageReader.h"
 #include "Tests/Recording/PcapngFile.h"
 #include "Tests/Support/Hex.h"

@@ -1,8 +1,8 @@
 #include "Recording/OpenMessages.h"
 
-#include "Recording/FileSource.h"
-#include "Recording/RecordingReader.h"
-#include "Recording/RecordingWriter.h"
+#include "Recording/Files/FileSource.h"
+#include "Recording/Pcapng/RecordingReader.h"
+#include "Recording/Pcapng/RecordingWriter.h"
 #include "Tests/Recording/LogFile.h"
 #include "Tests/Recording/PcapngFile.h"
 #include "Tests/Support/TemporaryDirectory.h"

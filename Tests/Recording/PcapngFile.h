@@ -1,6 +1,6 @@
 #pragma once
 
-#include "Recording/RecordingReader.h"
+#include "Recording/Pcapng/RecordingReader.h"
 #include "Tests/Support/Hex.h"
 
 #include <cstdint>

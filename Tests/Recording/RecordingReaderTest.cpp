@@ -1,4 +1,4 @@
-#include "Recording/RecordingReader.h"
+#include "Recording/Pcapng/RecordingReader.h"
 
 #include "Tests/Recording/PcapngFile.h"
 

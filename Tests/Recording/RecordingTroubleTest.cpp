@@ -1,5 +1,5 @@
-#include "Recording/RecordingReader.h"
-#include "Recording/RecordingWriter.h"
+#include "Recording/Pcapng/RecordingReader.h"
+#include "Recording/Pcapng/RecordingWriter.h"
 #include "Tests/Recording/FakeRecordingFile.h"
 #include "Tests/Recording/PcapngFile.h"
 

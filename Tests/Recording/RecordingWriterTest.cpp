@@ -1,7 +1,7 @@
-#include "Recording/RecordingWriter.h"
+#include "Recording/Pcapng/RecordingWriter.h"
 
 #include "Recording/MessageReader.h"
-#include "Recording/RecordingReader.h"
+#include "Recording/Pcapng/RecordingReader.h"
 #include "Tests/Recording/PcapngFile.h"
 #include "Tests/Support/TemporaryDirectory.h"
 

@@ -1,6 +1,6 @@
-#include "Recording/SnapshotReader.h"
+#include "Recording/Snapshots/SnapshotReader.h"
 
-#include "Platform/PropertyList.h"
+#include "PropertyLists/PropertyList.h"
 #include "Tests/Recording/LogFile.h"
 
 #include <memory>

@@ -1,7 +1,7 @@
 #include "Tests/Recordings/ExampleRecording.h"
 
-#include "Recording/RecordingWriter.h"
-#include "Telephony/DriveScenario.h"
+#include "Recording/Pcapng/RecordingWriter.h"
+#include "Telephony/Drives/DriveScenario.h"
 
 #include <chrono>
 

@@ -2,7 +2,7 @@
 
 #include "Platform/Clock.h"
 #include "Platform/Result.h"
-#include "Telephony/ScenarioRegistry.h"
+#include "Telephony/Drives/ScenarioRegistry.h"
 
 #include <cstdint>
 #include <functional>

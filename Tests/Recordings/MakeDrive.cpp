@@ -1,6 +1,6 @@
-#include "Recording/RecordingWriter.h"
-#include "Telephony/DriveScenario.h"
-#include "Telephony/ScenarioRegistry.h"
+#include "Recording/Pcapng/RecordingWriter.h"
+#include "Telephony/Drives/DriveScenario.h"
+#include "Telephony/Drives/ScenarioRegistry.h"
 
 #include <charconv>
 #include <chrono>

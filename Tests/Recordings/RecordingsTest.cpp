@@ -1,5 +1,5 @@
 #include "LogGenerator/LogGenerator.h"
-#include "Platform/Linux/FileResources.h"
+#include "Platform/Linux/Files/FileResources.h"
 #include "Platform/TelephonyService.h"
 #include "Recording/OpenMessages.h"
 #include "Tests/Recordings/ExampleRecording.h"

@@ -1,5 +1,5 @@
 #include "Platform/TelephonyService.h"
-#include "Telephony/ScenarioRegistry.h"
+#include "Telephony/Drives/ScenarioRegistry.h"
 #include "Tests/Resources/DissectorSections.h"
 #include "Tests/Resources/HelpText.h"
 #include "Tests/Support/ShellCommand.h"

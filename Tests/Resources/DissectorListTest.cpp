@@ -1,6 +1,6 @@
-#include "Platform/PropertyList.h"
+#include "LogMessages/RecordHeader.h"
+#include "PropertyLists/PropertyList.h"
 #include "Recording/OpenMessages.h"
-#include "Recording/RecordHeader.h"
 #include "Tests/Recordings/ExampleRecording.h"
 #include "Tests/Resources/Dissection.h"
 #include "Tests/Support/Hex.h"

@@ -3,7 +3,7 @@
 #include "LogGenerator/C2K/LogCodeParsers.h"
 #include "LogGenerator/LogGenerator.h"
 #include "LogGenerator/OstrelLogGenerator2.h"
-#include "Platform/Linux/FileResources.h"
+#include "Platform/Linux/Files/FileResources.h"
 #include "Platform/TelephonyService.h"
 #include "Tests/Support/FakeClock.h"
 

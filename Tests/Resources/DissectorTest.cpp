@@ -1,6 +1,6 @@
+#include "LogMessages/RecordHeader.h"
+#include "LogMessages/RecordTime.h"
 #include "Recording/OpenMessages.h"
-#include "Recording/RecordHeader.h"
-#include "Recording/RecordTime.h"
 #include "Tests/Recording/PcapngFile.h"
 #include "Tests/Recordings/ExampleRecording.h"
 #include "Tests/Resources/Dissection.h"

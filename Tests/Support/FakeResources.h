@@ -1,7 +1,7 @@
 #pragma once
 
-#include "Platform/PropertyList.h"
 #include "Platform/Resources.h"
+#include "PropertyLists/PropertyList.h"
 
 #include <map>
 #include <optional>

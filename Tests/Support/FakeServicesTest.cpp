@@ -1,3 +1,4 @@
+#include "Platform/DateText.h"
 #include "Tests/Support/CapturedLog.h"
 #include "Tests/Support/FakeClock.h"
 #include "Tests/Support/FakeResources.h"

@@ -1,6 +1,6 @@
 #include "Tests/Support/Hex.h"
 
-#include "Platform/PropertyList.h"
+#include "PropertyLists/PropertyList.h"
 
 #include <stdexcept>
 #include <string>

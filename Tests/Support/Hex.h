@@ -2,7 +2,7 @@
 
 #include "Platform/Bytes.h"
 #include "Platform/Clock.h"
-#include "Platform/Value.h"
+#include "PropertyLists/Value.h"
 
 #include <chrono>
 #include <cstdint>

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "Platform/Linux/FileDescriptor.h"
+#include "Platform/Linux/Files/FileDescriptor.h"
 
 #include <sys/socket.h>
 #include <sys/un.h>

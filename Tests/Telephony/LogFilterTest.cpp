@@ -1,4 +1,4 @@
-#include "Telephony/LogFilter.h"
+#include "Telephony/Service/LogFilter.h"
 
 #include "Tests/Support/Hex.h"
 

@@ -1,7 +1,7 @@
 #include "Tests/Telephony/LogServerFixture.h"
 
-#include "Telephony/GSMScenario.h"
-#include "Telephony/ScenarioSource.h"
+#include "Telephony/Drives/GSM/GSMScenario.h"
+#include "Telephony/Sources/ScenarioSource.h"
 #include "Tests/Support/Hex.h"
 
 #include <gmock/gmock.h>

@@ -1,7 +1,7 @@
 #pragma once
 
 #include "Platform/TelephonyService.h"
-#include "Telephony/LogServer.h"
+#include "Telephony/Service/LogServer.h"
 #include "Tests/Support/CapturedLog.h"
 #include "Tests/Support/FakeMainQueue.h"
 #include "Tests/Support/FakeMessagePorts.h"

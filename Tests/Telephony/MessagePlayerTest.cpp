@@ -1,7 +1,7 @@
-#include "Telephony/MessagePlayer.h"
+#include "Telephony/Sources/MessagePlayer.h"
 
-#include "Telephony/GSMScenario.h"
-#include "Telephony/ScenarioSource.h"
+#include "Telephony/Drives/GSM/GSMScenario.h"
+#include "Telephony/Sources/ScenarioSource.h"
 #include "Tests/Support/FakeMainQueue.h"
 #include "Tests/Support/Hex.h"
 #include "Tests/Telephony/TelephonyTesting.h"

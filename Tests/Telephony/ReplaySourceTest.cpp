@@ -1,7 +1,7 @@
-#include "Telephony/ReplaySource.h"
+#include "Telephony/Sources/ReplaySource.h"
 
-#include "Recording/RecordingWriter.h"
-#include "Telephony/SourceFactory.h"
+#include "Recording/Pcapng/RecordingWriter.h"
+#include "Telephony/Sources/SourceFactory.h"
 #include "Tests/Support/CapturedLog.h"
 #include "Tests/Support/FakeMainQueue.h"
 #include "Tests/Support/Hex.h"

@@ -1,6 +1,6 @@
-#include "Telephony/SourceString.h"
-#include "Telephony/ScenarioRegistry.h"
-#include "Telephony/SourceFactory.h"
+#include "Telephony/Sources/SourceString.h"
+#include "Telephony/Drives/ScenarioRegistry.h"
+#include "Telephony/Sources/SourceFactory.h"
 
 #include "Platform/TelephonyService.h"
 

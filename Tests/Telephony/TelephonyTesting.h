@@ -1,8 +1,8 @@
 #pragma once
 
-#include "Platform/PropertyList.h"
-#include "Platform/Value.h"
-#include "Telephony/LogSource.h"
+#include "PropertyLists/PropertyList.h"
+#include "PropertyLists/Value.h"
+#include "Telephony/Sources/LogSource.h"
 
 #include <chrono>
 #include <cstdint>

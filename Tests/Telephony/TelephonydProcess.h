@@ -1,8 +1,8 @@
 #pragma once
 
-#include "Platform/Linux/LinuxMessagePorts.h"
-#include "Platform/Linux/LinuxTelephonyService.h"
 #include "Platform/Linux/MainLoop.h"
+#include "Platform/Linux/Ports/LinuxMessagePorts.h"
+#include "Platform/Linux/Ports/LinuxTelephonyService.h"
 
 #include <chrono>
 #include <filesystem>

@@ -1,7 +1,7 @@
 #include "Tests/Telephony/TelephonydProcess.h"
 
-#include "Recording/RecordingWriter.h"
-#include "Telephony/GSMScenario.h"
+#include "Recording/Pcapng/RecordingWriter.h"
+#include "Telephony/Drives/GSM/GSMScenario.h"
 #include "Tests/Support/FakeClock.h"
 #include "Tests/Support/Hex.h"
 #include "Tests/Support/NotifySocket.h"

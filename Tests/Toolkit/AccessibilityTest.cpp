@@ -1,8 +1,8 @@
 #include "Tests/Toolkit/ToolkitTest.h"
 
+#include "Toolkit/Bars/LabelItem.h"
+#include "Toolkit/Bars/SaveButton.h"
 #include "Toolkit/BusyIndicator.h"
-#include "Toolkit/LabelItem.h"
-#include "Toolkit/SaveButton.h"
 #include "Toolkit/ScrollView.h"
 #include "Toolkit/TextField.h"
 #include "Toolkit/Widgets/Accessibility.h"

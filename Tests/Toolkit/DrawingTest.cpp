@@ -3,7 +3,7 @@
 #include "Tests/Toolkit/ToolkitTest.h"
 
 #include "Toolkit/Widgets/LabelWidget.h"
-#include "Toolkit/Widgets/TableWidget.h"
+#include "Toolkit/Widgets/Tables/TableWidget.h"
 
 #include <QApplication>
 #include <QImage>

@@ -1,6 +1,6 @@
 #include "Tests/Toolkit/ToolkitTest.h"
 
-#include "Toolkit/SaveButton.h"
+#include "Toolkit/Bars/SaveButton.h"
 
 #include <QTest>
 

@@ -1,8 +1,8 @@
 #include "Tests/Toolkit/ToolkitTest.h"
 
 #include "Toolkit/ScrollView.h"
-#include "Toolkit/Widgets/CellWidget.h"
-#include "Toolkit/Widgets/TableWidget.h"
+#include "Toolkit/Widgets/Tables/CellWidget.h"
+#include "Toolkit/Widgets/Tables/TableWidget.h"
 
 #include <QApplication>
 #include <QTest>

@@ -4,7 +4,7 @@
 
 #include "Tests/Toolkit/ToolkitTest.h"
 
-#include "Toolkit/Widgets/CellWidget.h"
+#include "Toolkit/Widgets/Tables/CellWidget.h"
 
 namespace velmora {
 namespace {

@@ -1,7 +1,7 @@
 #include "Tests/Toolkit/ToolkitTest.h"
 
 #include "Toolkit/ScrollView.h"
-#include "Toolkit/Widgets/TableWidget.h"
+#include "Toolkit/Widgets/Tables/TableWidget.h"
 
 #include <QPointingDevice>
 #include <QScroller>

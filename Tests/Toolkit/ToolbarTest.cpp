@@ -1,9 +1,9 @@
 #include "Tests/Toolkit/ToolkitTest.h"
 
+#include "Toolkit/Bars/FlexibleSpace.h"
+#include "Toolkit/Bars/LabelItem.h"
+#include "Toolkit/Bars/SaveButton.h"
 #include "Toolkit/BusyIndicator.h"
-#include "Toolkit/FlexibleSpace.h"
-#include "Toolkit/LabelItem.h"
-#include "Toolkit/SaveButton.h"
 #include "Toolkit/Widgets/LabelWidget.h"
 #include "Toolkit/Widgets/SpinnerWidget.h"
 

@@ -1,9 +1,9 @@
 #pragma once
 
 #include "Toolkit/Application.h"
-#include "Toolkit/NavigationController.h"
-#include "Toolkit/TableCell.h"
-#include "Toolkit/TableViewController.h"
+#include "Toolkit/Navigation/NavigationController.h"
+#include "Toolkit/Tables/TableCell.h"
+#include "Toolkit/Tables/TableViewController.h"
 #include "Toolkit/Window.h"
 
 #include <QString>

@@ -1,5 +1,5 @@
 #include "Platform/Linux/LoopTimer.h"
-#include "Platform/PropertyList.h"
+#include "PropertyLists/PropertyList.h"
 #include "Recording/OpenMessages.h"
 #include "Tests/Tools/ToolFixture.h"
 

@@ -1,7 +1,7 @@
 #include "Tests/Tools/FakeLogService.h"
 
-#include "Platform/PropertyList.h"
 #include "Platform/TelephonyService.h"
+#include "PropertyLists/PropertyList.h"
 #include "Tests/Tools/ToolFixture.h"
 
 #include <algorithm>

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "Platform/Linux/LinuxMessagePorts.h"
+#include "Platform/Linux/Ports/LinuxMessagePorts.h"
 
 #include <filesystem>
 #include <memory>

@@ -1,4 +1,4 @@
-#include "Tools/RecordingSession.h"
+#include "Tools/Record/RecordingSession.h"
 
 #include "Tests/Tools/RecordFixture.h"
 

@@ -1,4 +1,4 @@
-#include "Tools/TerminalFrame.h"
+#include "Tools/Watch/TerminalFrame.h"
 
 #include <gmock/gmock.h>
 

@@ -1,7 +1,7 @@
 #include "Tests/Tools/ToolFixture.h"
 
-#include "Platform/PropertyList.h"
-#include "Recording/RecordingWriter.h"
+#include "PropertyLists/PropertyList.h"
+#include "Recording/Pcapng/RecordingWriter.h"
 
 #include <algorithm>
 #include <filesystem>

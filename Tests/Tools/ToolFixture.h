@@ -1,7 +1,7 @@
 #pragma once
 
 #include "Platform/Clock.h"
-#include "Platform/Value.h"
+#include "PropertyLists/Value.h"
 #include "Tests/Support/Hex.h"
 #include "Tests/Support/TemporaryDirectory.h"
 #include "Tests/Tools/ToolProcess.h"

@@ -1,8 +1,8 @@
 #pragma once
 
-#include "Platform/Linux/FileDescriptor.h"
+#include "Platform/Linux/Files/FileDescriptor.h"
 #include "Platform/Linux/MainLoop.h"
-#include "Platform/Linux/SocketWatch.h"
+#include "Platform/Linux/Ports/SocketWatch.h"
 
 #include <cstdint>
 #include <functional>

@@ -1,13 +1,13 @@
 #include "Toolkit/Widgets/Accessibility.h"
 
-#include "Toolkit/TableCell.h"
-#include "Toolkit/TableView.h"
-#include "Toolkit/Widgets/CellWidget.h"
+#include "Toolkit/Tables/TableCell.h"
+#include "Toolkit/Tables/TableView.h"
 #include "Toolkit/Widgets/Conversions.h"
 #include "Toolkit/Widgets/HeaderBar.h"
 #include "Toolkit/Widgets/SheetWidget.h"
 #include "Toolkit/Widgets/SpinnerWidget.h"
-#include "Toolkit/Widgets/TableWidget.h"
+#include "Toolkit/Widgets/Tables/CellWidget.h"
+#include "Toolkit/Widgets/Tables/TableWidget.h"
 
 #include <QAccessible>
 #include <QAccessibleWidget>

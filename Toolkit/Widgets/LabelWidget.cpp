@@ -1,7 +1,7 @@
 #include "Toolkit/Widgets/LabelWidget.h"
 
-#include "Toolkit/Widgets/CellWidget.h"
 #include "Toolkit/Widgets/Conversions.h"
+#include "Toolkit/Widgets/Tables/CellWidget.h"
 
 #include <QFontMetricsF>
 #include <QPainter>

@@ -1,7 +1,7 @@
 #pragma once
 
+#include "Toolkit/Navigation/ViewController.h"
 #include "Toolkit/View.h"
-#include "Toolkit/ViewController.h"
 #include "Toolkit/Widgets/Motion.h"
 #include "Toolkit/Widgets/SheetWidget.h"
 #include "Toolkit/Widgets/WindowWidget.h"

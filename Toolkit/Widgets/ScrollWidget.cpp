@@ -1,7 +1,7 @@
 #include "Toolkit/Widgets/ScrollWidget.h"
 
 #include "Toolkit/Widgets/Finger.h"
-#include "Toolkit/Widgets/TableWidget.h"
+#include "Toolkit/Widgets/Tables/TableWidget.h"
 
 #include <QScrollEvent>
 #include <QScrollPrepareEvent>

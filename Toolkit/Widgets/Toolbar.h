@@ -1,6 +1,6 @@
 #pragma once
 
-#include "Toolkit/ToolbarItem.h"
+#include "Toolkit/Bars/ToolbarItem.h"
 
 #include <QWidget>
 

@@ -1,7 +1,7 @@
 #include "LogGenerator/C2K/C2KLogGenerator.h"
 
-#include "Platform/PropertyList.h"
 #include "Platform/TelephonyService.h"
+#include "PropertyLists/PropertyList.h"
 #include "Tests/LogGenerator/C2K/ParserHarness.h"
 #include "Tests/Support/FakeClock.h"
 #include "Tests/Support/FakeResources.h"

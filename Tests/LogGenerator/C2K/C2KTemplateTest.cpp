@@ -1,5 +1,5 @@
 #include "LogGenerator/C2K/C2KLogGenerator.h"
-#include "Platform/PropertyList.h"
+#include "PropertyLists/PropertyList.h"
 #include "Tests/LogGenerator/C2K/ParserHarness.h"
 
 #include <gmock/gmock.h>

@@ -1,7 +1,7 @@
 #pragma once
 
 #include "LogGenerator/C2K/LogCodeParsers.h"
-#include "Platform/Value.h"
+#include "PropertyLists/Value.h"
 #include "Tests/Support/CapturedLog.h"
 
 #include <cstdint>

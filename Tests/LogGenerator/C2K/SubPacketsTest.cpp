@@ -1,4 +1,4 @@
-#include "LogGenerator/C2K/SubPackets.h"
+#include "LogGenerator/C2K/OneX/SubPackets.h"
 
 #include "Tests/LogGenerator/C2K/ParserHarness.h"
 #include "Tests/Support/Hex.h"

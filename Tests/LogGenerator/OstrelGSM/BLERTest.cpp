@@ -1,4 +1,4 @@
-#include "LogGenerator/OstrelGSM/BLER.h"
+#include "LogGenerator/OstrelGSM/UMTS/BLER.h"
 
 #include "Tests/LogGenerator/SectionHarness.h"
 #include "Tests/Support/Hex.h"

@@ -1,4 +1,4 @@
-#include "LogGenerator/OstrelGSM/EquivalentPLMNList.h"
+#include "LogGenerator/OstrelGSM/Registration/EquivalentPLMNList.h"
 
 #include "Tests/LogGenerator/SectionHarness.h"
 #include "Tests/Support/Hex.h"

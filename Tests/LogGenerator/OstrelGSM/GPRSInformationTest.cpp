@@ -1,4 +1,4 @@
-#include "LogGenerator/OstrelGSM/GPRSInformation.h"
+#include "LogGenerator/OstrelGSM/GSM/GPRSInformation.h"
 
 #include "Tests/LogGenerator/SectionHarness.h"
 #include "Tests/Support/Hex.h"

@@ -1,4 +1,4 @@
-#include "LogGenerator/OstrelGSM/GSMRRInfo.h"
+#include "LogGenerator/OstrelGSM/GSM/GSMRRInfo.h"
 
 #include "Tests/LogGenerator/SectionHarness.h"
 #include "Tests/Support/Hex.h"

@@ -1,4 +1,4 @@
-#include "LogGenerator/OstrelGSM/GSMServingCell.h"
+#include "LogGenerator/OstrelGSM/GSM/GSMServingCell.h"
 
 #include "Tests/LogGenerator/SectionHarness.h"
 #include "Tests/Support/Hex.h"

@@ -1,4 +1,4 @@
-#include "LogGenerator/OstrelGSM/HSDPAInformation.h"
+#include "LogGenerator/OstrelGSM/UMTS/HSDPAInformation.h"
 
 #include "Tests/LogGenerator/SectionHarness.h"
 #include "Tests/Support/Hex.h"

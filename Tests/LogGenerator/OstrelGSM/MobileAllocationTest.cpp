@@ -1,4 +1,4 @@
-#include "LogGenerator/OstrelGSM/MobileAllocation.h"
+#include "LogGenerator/OstrelGSM/GSM/MobileAllocation.h"
 
 #include "Tests/LogGenerator/SectionHarness.h"
 #include "Tests/Support/Hex.h"

@@ -1,4 +1,4 @@
-#include "LogGenerator/OstrelGSM/NeighboringCells.h"
+#include "LogGenerator/OstrelGSM/GSM/NeighboringCells.h"
 
 #include "Tests/LogGenerator/SectionHarness.h"
 #include "Tests/Support/Hex.h"

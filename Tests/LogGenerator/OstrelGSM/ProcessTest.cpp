@@ -1,6 +1,6 @@
-#include "LogGenerator/OstrelGSM/ProcessCO.h"
-#include "LogGenerator/OstrelGSM/ProcessCS.h"
-#include "LogGenerator/OstrelGSM/ProcessPS.h"
+#include "LogGenerator/OstrelGSM/Registration/ProcessCO.h"
+#include "LogGenerator/OstrelGSM/Registration/ProcessCS.h"
+#include "LogGenerator/OstrelGSM/Registration/ProcessPS.h"
 #include "Tests/LogGenerator/SectionHarness.h"
 #include "Tests/Support/Hex.h"
 

@@ -1,5 +1,5 @@
-#include "LogGenerator/OstrelGSM/GSMSet.h"
-#include "LogGenerator/OstrelGSM/UMTSSet.h"
+#include "LogGenerator/OstrelGSM/GSM/GSMSet.h"
+#include "LogGenerator/OstrelGSM/UMTS/UMTSSet.h"
 #include "Tests/LogGenerator/SectionHarness.h"
 #include "Tests/Support/Hex.h"
 

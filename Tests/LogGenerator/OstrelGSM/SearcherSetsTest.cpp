@@ -1,7 +1,7 @@
-#include "LogGenerator/OstrelGSM/ActiveSet.h"
-#include "LogGenerator/OstrelGSM/DetectedSet.h"
-#include "LogGenerator/OstrelGSM/MonitoredSet.h"
-#include "LogGenerator/OstrelGSM/VirtualActiveSet.h"
+#include "LogGenerator/OstrelGSM/UMTS/ActiveSet.h"
+#include "LogGenerator/OstrelGSM/UMTS/DetectedSet.h"
+#include "LogGenerator/OstrelGSM/UMTS/MonitoredSet.h"
+#include "LogGenerator/OstrelGSM/UMTS/VirtualActiveSet.h"
 #include "Tests/LogGenerator/SectionHarness.h"
 #include "Tests/Support/Hex.h"
 

@@ -1,4 +1,4 @@
-#include "LogGenerator/OstrelGSM/ServingPLMN.h"
+#include "LogGenerator/OstrelGSM/Registration/ServingPLMN.h"
 
 #include "Tests/LogGenerator/SectionHarness.h"
 #include "Tests/Support/Hex.h"

@@ -1,4 +1,4 @@
-#include "LogGenerator/OstrelGSM/UMTSRRInfo.h"
+#include "LogGenerator/OstrelGSM/UMTS/UMTSRRInfo.h"
 
 #include "Tests/LogGenerator/SectionHarness.h"
 #include "Tests/Support/Hex.h"

@@ -1,9 +1,9 @@
 #include "Tests/Telephony/ModemManager/ModemManagerFixture.h"
 
 #include "LogGenerator/LogGenerator.h"
-#include "Platform/PropertyList.h"
-#include "Recording/RecordHeader.h"
-#include "Recording/RecordTime.h"
+#include "LogMessages/RecordHeader.h"
+#include "LogMessages/RecordTime.h"
+#include "PropertyLists/PropertyList.h"
 #include "Tests/Support/FakeResources.h"
 #include "Tests/Support/ShippedResources.h"
 

@@ -1,8 +1,8 @@
 #include "Tests/Telephony/ModemManager/MockModemManager.h"
 #include "Tests/Telephony/ModemManager/ModemManagerProcesses.h"
 
-#include "Recording/RecordHeader.h"
-#include "Recording/RecordTime.h"
+#include "LogMessages/RecordHeader.h"
+#include "LogMessages/RecordTime.h"
 
 #include <gmock/gmock.h>
 

@@ -1,0 +1,49 @@
+#include "LogGenerator/C2K/OneX/ActiveSetInfo.h"
+
+#include "LogGenerator/C2K/PilotList.h"
+
+#include <cmath>
+
+namespace velmora::C2K {
+
+namespace {
+
+/// A pilot's PN offset lies so far behind where the cursor stands; the cursor begins at the sub-packet's own
+/// start, not behind its header.
+constexpr std::size_t pnOffsetAt = 12;
+constexpr std::size_t firstEnergyAt = 24;
+
+constexpr double leastRatio = 0.00001; // -50 dB
+
+} // namespace
+
+ActiveSetInfo::ActiveSetInfo(const Record& subPacket)
+    : _subPacket(subPacket), _n(subPacket.u16(4)), _g(subPacket.u8(6)), _s(subPacket.u8(7)),
+      _count(subPacket.u8(8)), _energyAt(firstEnergyAt + std::size_t{4} * subPacket.u8(9)),
+      _stride((std::size_t{6} * subPacket.u8(9) + 15) & 0xFFC), _referencePN(subPacket.u16(10)) {}
+
+std::size_t ActiveSetInfo::neededLength() const {
+    return _count == 0 ? headerLength : _stride * (_count - 1) + _energyAt + 2;
+}
+
+Value ActiveSetInfo::pilots() const {
+    PilotList list;
+    for (std::size_t i = 0; i < _count; ++i) {
+        const std::size_t cursor = _stride * i;
+        const std::uint16_t pnOffset = _subPacket.u16(cursor + pnOffsetAt);
+        std::string text = decibels(energyRatio(_subPacket.u16(cursor + _energyAt)));
+        if (pnOffset == _referencePN)
+            text.insert(0, "(ref pilot) ");
+        list.add(i, pnOffset, std::move(text));
+    }
+    return list.value();
+}
+
+double ActiveSetInfo::energyRatio(std::uint16_t energy) const {
+    const double n = _n;
+    const double ratio = std::ldexp(energy, 2 * _s - 3) / (9 * n * n * _g) - 1 / n;
+    // fmax, since a ratio that is no number (N or G of 0) shows the floor, too.
+    return std::fmax(ratio, leastRatio);
+}
+
+} // namespace velmora::C2K

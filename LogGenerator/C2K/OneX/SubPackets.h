@@ -1,0 +1,56 @@
+#pragma once
+
+#include "LogMessages/Record.h"
+
+#include <cstddef>
+#include <cstdint>
+
+namespace velmora::C2K {
+
+/// What a search for a sub-packet came to.
+struct FoundSubPacket {
+    enum class Outcome : std::uint8_t {
+        Found,
+        Missing, ///< there is none, or an error in size came first (which has been reported)
+        Outside, ///< the search came to a header that the record does not hold
+    };
+
+    Outcome outcome = Outcome::Missing;
+    int index = 0;          ///< from 0, of the sub-packet where the search ended
+    std::size_t offset = 0; ///< its start in the record
+
+    [[nodiscard]] bool found() const { return outcome == Outcome::Found; }
+};
+
+/// The sub-packets of a 1x record: their number at byte 14, the first at byte 17, each beginning with its id
+/// (at 0) and its total size (16 bits at 2).
+class SubPackets {
+public:
+    static constexpr std::size_t minimumLength = 17;
+
+    /// Precondition: the record has the minimum length.
+    explicit SubPackets(const Record& record) : _record(record) {}
+
+    /// The first sub-packet of that id. One that ends 17 bytes or more behind the record's end is an error in
+    /// size: an error line, whatever its id, and the search is over. (One that ends less far behind it is
+    /// taken, on purpose; what it needs is for `reaches` to say.)
+    [[nodiscard]] FoundSubPacket find(std::uint8_t id) const;
+
+    /// Whether the record holds the first `length` bytes from the sub-packet's start on; an error line where
+    /// it does not. Every search that ended outside the record fails here.
+    [[nodiscard]] bool reaches(const FoundSubPacket& subPacket, std::size_t length,
+                               std::uint16_t logCode) const;
+
+    /// The record from the sub-packet's start on.
+    [[nodiscard]] Record from(const FoundSubPacket& subPacket) const {
+        return _record.part(subPacket.offset, _record.size() - subPacket.offset);
+    }
+
+    /// Id and size.
+    static constexpr std::size_t headerLength = 4;
+
+private:
+    Record _record;
+};
+
+} // namespace velmora::C2K

@@ -1,0 +1,89 @@
+#include "LogGenerator/C2K/OneX/SystemIdentification.h"
+
+#include "LogGenerator/C2K/ValueField.h"
+#include "Platform/SystemLog.h"
+
+namespace velmora::C2K {
+
+namespace {
+
+constexpr std::size_t minimumLength = 171;
+constexpr std::size_t versionAt = 13;
+constexpr int leastVersion = 2;
+
+constexpr EnumText roamingIndicatorRows[] = {
+    {0, "OFF [0]"},
+    {1, "ON [1]"},
+    {2, "Flashing [2]"},
+    {3, "Out of Neighborhood [3]"},
+    {4, "Out of Building [4]"},
+    {5, "Preferred system [5]"},
+    {6, "Available system [6]"},
+    {7, "Alliance partner [7]"},
+    {8, "Premium partner [8]"},
+    {9, "Full service functionality [9]"},
+    {10, "Partial service functionality [10]"},
+    {11, "Banner ON [11]"},
+    {12, "Banner OFF [12]"},
+};
+constexpr NumberedTexts roamingIndicators(roamingIndicatorRows, "ERI - ", "");
+
+constexpr ValueField roaming[] = {
+    {"k1xRoamingHome", u32At(42), roamingIndicators},
+};
+constexpr std::size_t systemTypeAt = 46;
+constexpr std::uint32_t cdmaSystem = 2;
+constexpr ValueField identities[] = {
+    // Those of a system of another type mean something else.
+    {"kSystemId", u16At(50), integer("%d")},
+    {"kNetworkId", u16At(52), integer("%d")},
+};
+constexpr ValueField zone[] = {
+    {"kPacketZoneId", u8At(131), integer("%d")},
+};
+constexpr ValueField baseStation[] = {
+    {"kBaseId", u16At(184), integer("%d")}, // behind the minimum length
+};
+constexpr ValueField revision[] = {
+    {"kProtocolRevision", u8At(133), integer("%d")},
+};
+static_assert(endOf(roaming, true) <= minimumLength && endOf(identities, true) <= minimumLength &&
+              endOf(zone, true) <= minimumLength && endOf(revision, true) <= minimumLength);
+
+/// What stands for the identities of a system of another type, whose number is in these bytes.
+Value unknownSystem(Bytes type, const void*) {
+    return "(unknown system type " + std::to_string(static_cast<std::int32_t>(Record(type).u32(0))) + ")";
+}
+
+} // namespace
+
+void SystemIdentification::parse(const Record& record, Dictionary&, const Publisher& publisher) const {
+    if (record.size() < minimumLength) {
+        logFormat(LogPriority::Error, "Log code 0x134f is %d bytes long but must be at least %lu bytes.",
+                  static_cast<int>(record.size()), static_cast<unsigned long>(minimumLength));
+        return;
+    }
+    const int version = record.u8(versionAt);
+    if (version < leastVersion) {
+        logFormat(LogPriority::Error,
+                  "Log code 0x134f has version=%d; only version 2 or higher expected; dropping.", version);
+        return;
+    }
+    publishFields(publisher, record, roaming, true);
+    if (const Record type = record.part(systemTypeAt, 4); type.u32(0) == cdmaSystem) {
+        publishFields(publisher, record, identities, true);
+    } else {
+        for (const ValueField& identity : identities)
+            publisher.publishLater(identity.key, unknownSystem, nullptr, type.bytes());
+    }
+    publishFields(publisher, record, zone, true);
+    if (record.size() >= endOf(baseStation, true))
+        publishFields(publisher, record, baseStation, true);
+    else
+        logFormat(LogPriority::Error,
+                  "Log code 0x134f is %d bytes long but must be at least %lu bytes for the base station id.",
+                  static_cast<int>(record.size()), static_cast<unsigned long>(endOf(baseStation, true)));
+    publishFields(publisher, record, revision, true);
+}
+
+} // namespace velmora::C2K

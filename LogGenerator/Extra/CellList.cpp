@@ -1,0 +1,78 @@
+#include "LogGenerator/Extra/CellList.h"
+
+#include "LogGenerator/Extra/BinaryCellReader.h"
+#include "LogGenerator/Extra/ExtraPayload.h"
+
+#include <algorithm>
+
+namespace velmora {
+
+namespace {
+
+constexpr std::size_t headerLength = 13;
+/// A payload that is longer is read anew by every section, and so not kept in memory.
+constexpr std::size_t longestKept = std::size_t{1} << 16;
+
+/// A cell of the array as the property-list reader gave it.
+Cell cellOf(const Dictionary& fields) {
+    Cell cell;
+    if (const std::string* text = fields[kVoxCellMonitorCellRadioAccessTechnology].asString())
+        cell.kind.technology = placeOf(*text, cellTechnologies);
+    if (const std::string* text = fields[kVoxCellMonitorCellType].asString())
+        cell.kind.type = placeOf(*text, cellTypes);
+    for (std::size_t i = 0; i < cellNumberCount; ++i)
+        if (const auto number = cellNumber(fields, cellNumberKeys[i]))
+            cell.setNumber(i, *number);
+    return cell;
+}
+
+} // namespace
+
+const std::vector<Cell>* CellList::read(const Data& record) {
+    if (_isRead)
+        return &_cells;
+    if (!readPayload(record))
+        return nullptr;
+    _isRead = _isOneRecord;
+    return &_cells;
+}
+
+bool CellList::readPayload(const Data& record) {
+    const Bytes payload = record.from(headerLength).bytes();
+    if (!_payload.empty() && std::equal(payload.begin(), payload.end(), _payload.begin(), _payload.end()))
+        return true;
+    _payload.clear();
+    _cells.clear();
+    bool good = readBinaryCells(payload, _cells);
+    if (!good) {
+        _cells.clear();
+        good = _xmlReader.read({reinterpret_cast<const char*>(payload.data()), payload.size()}, _cells);
+    }
+    if (!good) {
+        _cells.clear();
+        if (!readSlowly(record))
+            return false;
+    }
+    if (payload.size() <= longestKept)
+        _payload.assign(payload.begin(), payload.end());
+    return true;
+}
+
+bool CellList::readSlowly(const Data& record) {
+    const CellInfoArrayReader reader(record);
+    const Array* cells = reader.parsed().asArray();
+    if (!cells)
+        return false;
+    for (const Value& cell : *cells)
+        if (const Dictionary* fields = cell.asDictionary())
+            _cells.push_back(cellOf(*fields));
+    return true;
+}
+
+const Cell* firstCell(const std::vector<Cell>& cells, const CellKind& kind) {
+    const auto found =
+        std::find_if(cells.begin(), cells.end(), [&kind](const Cell& cell) { return cell.kind == kind; });
+    return found == cells.end() ? nullptr : &*found;
+}
+
+} // namespace velmora

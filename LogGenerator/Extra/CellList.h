@@ -1,0 +1,47 @@
+#pragma once
+
+#include "LogGenerator/Extra/Cell.h"
+#include "LogGenerator/Extra/XMLCellReader.h"
+#include "Platform/Bytes.h"
+
+#include <cstdint>
+#include <vector>
+
+namespace velmora {
+
+/// The cell information array of the record that came last, read once for all sections that want it. Shared
+/// by the sections of a class index.
+class CellList {
+public:
+    /// The cells of the record, in the list's order, but what is no cell; null where the payload holds no
+    /// array or cannot be read, which then is logged as CellInfoArrayReader does. Valid until the next call.
+    [[nodiscard]] const std::vector<Cell>* read(const Data& record);
+
+    /// As long as it lives, every call of `read` is for one and the same record, so that it need not be
+    /// compared with the last.
+    class OneRecord {
+    public:
+        explicit OneRecord(CellList& cells) : _cells(cells) { _cells._isOneRecord = true; }
+        ~OneRecord() { _cells._isOneRecord = _cells._isRead = false; }
+        OneRecord(const OneRecord&) = delete;
+        OneRecord& operator=(const OneRecord&) = delete;
+
+    private:
+        CellList& _cells;
+    };
+
+private:
+    [[nodiscard]] bool readPayload(const Data& record);
+    [[nodiscard]] bool readSlowly(const Data& record);
+
+    std::vector<std::uint8_t> _payload; ///< that `_cells` were read from; empty before
+    std::vector<Cell> _cells;
+    XMLCellReader _xmlReader;
+    bool _isOneRecord = false;
+    bool _isRead = false; ///< the one record has been
+};
+
+/// The first cell of that kind, or null.
+[[nodiscard]] const Cell* firstCell(const std::vector<Cell>& cells, const CellKind& kind);
+
+} // namespace velmora

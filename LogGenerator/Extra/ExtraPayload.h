@@ -1,0 +1,94 @@
+#pragma once
+
+#include "Platform/Result.h"
+#include "PropertyLists/Value.h"
+
+#include <array>
+#include <cstddef>
+#include <cstdint>
+#include <exception>
+#include <optional>
+#include <string_view>
+#include <vector>
+
+namespace velmora {
+
+/// The extra stream's payload readers. Each is built from a whole record, reads the property list behind the
+/// 13-byte header and holds what it found for as long as it lives.
+
+/// The payloads that a section read last and what they held. The SIM's files and the contexts are told again
+/// and again without having changed, or as they were before, in both forms by turns: some of them are kept.
+class RememberedPayloads {
+public:
+    /// What the record's payload holds, as readPropertyList gives it.
+    [[nodiscard]] Result<Value> read(const Data& record);
+
+private:
+    struct Payload {
+        std::vector<std::uint8_t> bytes;
+        Value value;
+    };
+    std::array<Payload, 8> _payloads;
+    std::size_t _next = 0; ///< which is forgotten next
+};
+
+namespace LogCode_0xFF0000 {
+
+/// A SIM-file payload that is no property list. Nothing catches it: it ends the program, and that is meant.
+class UnknownDataException : public std::exception {
+public:
+    [[nodiscard]] const char* what() const noexcept override {
+        return "SIM File dictionary data could not be constructed";
+    }
+};
+
+/// The SIM's elementary files by the telephony service's keys.
+class SIMFileReader {
+public:
+    /// Logs and raises UnknownDataException when the payload cannot be read.
+    SIMFileReader(const Data& record, RememberedPayloads& earlier);
+    /// The value under `key`; null when there is none.
+    [[nodiscard]] const Value* value(std::string_view key) const;
+
+private:
+    Value _files;
+};
+
+} // namespace LogCode_0xFF0000
+
+/// The packet-data contexts: an array, or nothing where the payload is anything else or unreadable.
+class ContextListReader {
+public:
+    ContextListReader(const Data& record, RememberedPayloads& earlier);
+    [[nodiscard]] const Array* contexts() const { return _contexts.asArray(); }
+
+private:
+    Value _contexts;
+};
+
+/// The cell information array: the cells that the phone sees, as the telephony service describes them.
+class CellInfoArrayReader {
+public:
+    /// Logs "Cell Info Array data could not be constructed" when the payload cannot be read, and then holds
+    /// none.
+    explicit CellInfoArrayReader(const Data& record);
+    /// What the payload holds, whatever its kind.
+    [[nodiscard]] const Value& parsed() const { return _parsed; }
+    /// The cells. Where there is no array - the payload is unreadable or of another kind - null, with the
+    /// error line "Failed to get Cell Array".
+    [[nodiscard]] const Array* cells() const;
+
+private:
+    Value _parsed;
+};
+
+/// Whether `cell` is a dictionary whose radio access technology and cell type are the two given. One that
+/// lacks either key is of none.
+[[nodiscard]] bool isCell(const Value& cell, std::string_view technology, std::string_view type);
+
+/// A cell's number as a signed 32-bit integer. Absent where the key is missing or its value does not convert:
+/// text, data and booleans are no numbers, and a number that 32 bits or a whole number cannot hold would show
+/// as another one.
+[[nodiscard]] std::optional<std::int32_t> cellNumber(const Dictionary& cell, std::string_view key);
+
+} // namespace velmora

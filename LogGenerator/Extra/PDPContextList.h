@@ -1,0 +1,20 @@
+#pragma once
+
+#include "LogGenerator/Base.h"
+#include "LogGenerator/Extra/ExtraPayload.h"
+
+namespace velmora {
+
+/// "PDP Context Info": the active packet-data contexts, one row each, as the telephony service words them.
+/// Shared by the technologies.
+class PDPContextList final : public Base {
+public:
+    [[nodiscard]] std::string_view getSectionName() const override { return "PDP Context Info"; }
+    [[nodiscard]] std::vector<std::uint32_t> getLogCodeArray() const override { return {0xFF0002}; }
+    void updateWithData(const Data& data, std::uint32_t logCode) override;
+
+private:
+    RememberedPayloads _payloads;
+};
+
+} // namespace velmora

@@ -1,0 +1,20 @@
+#pragma once
+
+#include "LogGenerator/Base.h"
+#include "LogGenerator/Extra/ExtraPayload.h"
+
+namespace velmora {
+
+/// "SIM Info": the SIM's elementary files, as the telephony service words them. Shared by the technologies.
+class SimInfo final : public Base {
+public:
+    [[nodiscard]] std::string_view getSectionName() const override { return "SIM Info"; }
+    [[nodiscard]] std::vector<std::uint32_t> getLogCodeArray() const override { return {0xFF0000}; }
+    /// An unreadable payload raises LogCode_0xFF0000::UnknownDataException, which ends the program.
+    void updateWithData(const Data& data, std::uint32_t logCode) override;
+
+private:
+    RememberedPayloads _payloads;
+};
+
+} // namespace velmora

@@ -1,0 +1,171 @@
+#include "LogGenerator/Extra/XMLCellReader.h"
+
+#include <algorithm>
+
+namespace velmora {
+
+namespace {
+
+constexpr std::string_view head = "<?xml version=\"1.0\" encoding=\"UTF-8\"?>\n<plist version=\"1.0\">\n";
+/// Well within every limit of the property-list reader.
+constexpr std::size_t maximumLength = std::size_t{1} << 20;
+constexpr std::size_t maximumStretchLength = 2048;
+constexpr std::size_t maximumDigits = 18;
+
+/// Takes tags and texts off the front of a list.
+class Tokens {
+public:
+    explicit Tokens(std::string_view text) : _rest(text) {}
+
+    [[nodiscard]] std::string_view rest() const { return _rest; }
+    [[nodiscard]] bool take(std::string_view token) {
+        if (!_rest.starts_with(token))
+            return false;
+        _rest.remove_prefix(token.size());
+        return true;
+    }
+    void passSpace() {
+        const std::size_t end = _rest.find_first_not_of(" \t\n");
+        _rest.remove_prefix(std::min(end, _rest.size()));
+    }
+    /// A tag behind white space.
+    [[nodiscard]] bool tag(std::string_view token) {
+        passSpace();
+        return take(token);
+    }
+    /// Plain text up to the closing tag, which goes too.
+    [[nodiscard]] bool text(std::string_view closing, std::string_view& text) {
+        std::size_t end = 0;
+        while (end < _rest.size() && _rest[end] >= ' ' && _rest[end] <= '~' && _rest[end] != '<' &&
+               _rest[end] != '&' && _rest[end] != '>')
+            ++end;
+        text = _rest.substr(0, end);
+        _rest.remove_prefix(end);
+        return take(closing);
+    }
+
+private:
+    std::string_view _rest;
+};
+
+/// The digits at the front of `rest`, with a sign; 0 where there are none or too many.
+std::size_t numberLength(std::string_view rest, std::int64_t& number) {
+    const std::size_t first = !rest.empty() && rest[0] == '-' ? 1 : 0;
+    std::size_t end = first;
+    std::int64_t value = 0;
+    for (; end < rest.size() && rest[end] >= '0' && rest[end] <= '9'; ++end) {
+        if (end - first == maximumDigits)
+            return 0;
+        value = value * 10 + (rest[end] - '0');
+    }
+    number = first == 1 ? -value : value;
+    return end == first ? 0 : end;
+}
+
+} // namespace
+
+bool XMLCellReader::read(std::string_view text, std::vector<Cell>& cells) {
+    if (text.size() > maximumLength)
+        return false;
+    for (std::size_t at = 0;;) {
+        const Stretch* stretch = stretchAt(text.substr(at), at == 0);
+        if (!stretch)
+            return false;
+        at += stretch->text.size();
+        for (const Step& step : stretch->steps) {
+            switch (step.kind) {
+            case Step::Kind::BeginCell: cells.emplace_back(); break;
+            case Step::Kind::Technology: cells.back().kind.technology = step.value; break;
+            case Step::Kind::Type: cells.back().kind.type = step.value; break;
+            case Step::Kind::NotANumber: cells.back().setNoNumber(step.value); break;
+            }
+        }
+        if (stretch->number == noNumber)
+            return at == text.size();
+        std::int64_t number = 0;
+        const std::size_t length = numberLength(text.substr(at), number);
+        if (length == 0)
+            return false;
+        at += length;
+        if (stretch->number != unknownNumber)
+            cells.back().setNumber(stretch->number, number);
+    }
+}
+
+const XMLCellReader::Stretch* XMLCellReader::stretchAt(std::string_view rest, bool begins) {
+    const auto fits = [&](std::size_t place) {
+        return place < _stretches.size() && _stretches[place].begins == begins &&
+               rest.starts_with(_stretches[place].text);
+    };
+    std::size_t found = _last < _stretches.size() ? _stretches[_last].next : 0;
+    if (!fits(found)) {
+        for (found = 0; found < _stretches.size() && !fits(found);)
+            ++found;
+        if (found == _stretches.size()) {
+            if (_stretches.size() == maximumStretches)
+                _stretches.clear(); // what still comes is learnt again
+            if (!learn(rest, begins))
+                return nullptr;
+            found = _stretches.size() - 1;
+        }
+        if (_last < _stretches.size())
+            _stretches[_last].next = found;
+    }
+    _last = found;
+    return &_stretches[found];
+}
+
+/// Takes the stretch apart that `rest` begins with. There is a cell at hand, unless the list begins.
+bool XMLCellReader::learn(std::string_view rest, bool begins) {
+    Stretch stretch;
+    stretch.begins = begins;
+    const auto note = [&stretch](Step::Kind kind, std::size_t value) {
+        stretch.steps.push_back({kind, static_cast<std::uint8_t>(value)});
+    };
+    Tokens tokens(rest.substr(0, maximumStretchLength));
+    if (begins) {
+        if (!tokens.take(head) || !tokens.tag("<array>") || !tokens.tag("<dict>"))
+            return false;
+        note(Step::Kind::BeginCell, 0);
+    } else if (!tokens.take("</integer>")) {
+        return false;
+    }
+    for (;;) {
+        if (tokens.tag("</dict>")) {
+            if (tokens.tag("<dict>")) {
+                note(Step::Kind::BeginCell, 0);
+                continue;
+            }
+            if (!tokens.tag("</array>") || !tokens.tag("</plist>"))
+                return false;
+            tokens.passSpace();
+            break;
+        }
+        std::string_view key;
+        std::string_view value;
+        if (!tokens.tag("<key>") || !tokens.text("</key>", key))
+            return false;
+        const std::size_t number = placeOf(key, cellNumberKeys);
+        if (tokens.tag("<integer>")) {
+            // A number is neither technology nor type.
+            if (key == kVoxCellMonitorCellRadioAccessTechnology || key == kVoxCellMonitorCellType)
+                return false;
+            stretch.number = number < cellNumberCount ? static_cast<std::uint8_t>(number) : unknownNumber;
+            break;
+        }
+        if (!tokens.tag("<string>") || !tokens.text("</string>", value))
+            return false;
+        if (key == kVoxCellMonitorCellRadioAccessTechnology)
+            note(Step::Kind::Technology, placeOf(value, cellTechnologies));
+        else if (key == kVoxCellMonitorCellType)
+            note(Step::Kind::Type, placeOf(value, cellTypes));
+        else if (number < cellNumberCount)
+            note(Step::Kind::NotANumber, number);
+    }
+    const std::size_t length = std::min(rest.size(), maximumStretchLength) - tokens.rest().size();
+    stretch.text = rest.substr(0, length);
+    _stretches.push_back(std::move(stretch));
+    return true;
+}
+
+} // namespace velmora

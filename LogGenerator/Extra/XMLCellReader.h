@@ -1,0 +1,51 @@
+#pragma once
+
+#include "LogGenerator/Extra/Cell.h"
+
+#include <cstddef>
+#include <string>
+#include <string_view>
+#include <vector>
+
+namespace velmora {
+
+/// Reads the XML form of the cell information array as the telephony service writes it: an array of
+/// dictionaries whose values are strings and plain decimal integers. Everything else is left to the
+/// property-list reader; what this reader takes, that one would take, and would find the same in it.
+///
+/// The lists that come one after another differ in little but their numbers. So the reader remembers the
+/// stretches between two numbers (the end of one tag, keys, texts, the beginning of the next number) with
+/// what they say of the cells. A stretch that it meets again is compared and not taken apart: the place right
+/// behind a number is always the same place of the grammar, so that the same text there means the same.
+class XMLCellReader {
+public:
+    /// Appends the cells; false where the text is not of that form.
+    [[nodiscard]] bool read(std::string_view text, std::vector<Cell>& cells);
+
+private:
+    static constexpr std::size_t maximumStretches = 64;
+    static constexpr std::uint8_t noNumber = 0xFF; ///< the list ends here
+    static constexpr std::uint8_t unknownNumber = 0xFE;
+
+    /// One thing that a stretch says.
+    struct Step {
+        enum class Kind : std::uint8_t { BeginCell, Technology, Type, NotANumber };
+        Kind kind = Kind::BeginCell;
+        std::uint8_t value = 0;
+    };
+    struct Stretch {
+        std::string text;
+        bool begins = false; ///< it stands at the list's beginning, not behind a number
+        std::vector<Step> steps;
+        std::uint8_t number = noNumber; ///< the place of the number that follows
+        std::size_t next = 0;           ///< which stretch followed the last time
+    };
+
+    [[nodiscard]] const Stretch* stretchAt(std::string_view rest, bool begins);
+    [[nodiscard]] bool learn(std::string_view rest, bool begins);
+
+    std::vector<Stretch> _stretches;
+    std::size_t _last = 0; ///< the one that was met last
+};
+
+} // namespace velmora

@@ -1,0 +1,117 @@
+#include "LogGenerator/OstrelGSM/GSM/GPRSInformation.h"
+
+#include "Platform/SystemLog.h"
+
+namespace velmora {
+
+namespace {
+
+constexpr EnumText si13PositionRows[] = {
+    {0, "Located on BCCH"},
+    {1, "Located on Extended BCCH"},
+    {255, "Not Available"},
+};
+constexpr EnumTexts si13Positions(si13PositionRows, "Unknown");
+
+constexpr Field si13Fields[] = {
+    {"SI13 Position", u8At(14), text(si13Positions)},
+};
+constexpr Layout si13 = layout(15, si13Fields); // 0x51F4
+
+constexpr EnumText controlOrderRows[] = {
+    {0, "NC0"},
+    {1, "NC1"},
+    {2, "NC2"},
+    {255, "Not Available"},
+};
+constexpr EnumTexts controlOrders(controlOrderRows, "Unknown");
+
+constexpr EnumText pfcSupportRows[] = {
+    {0, "Not Supported"},
+    {1, "Supported"},
+    {255, "Available"}, // not "Not Available" as elsewhere, on purpose
+};
+constexpr EnumTexts pfcSupport(pfcSupportRows, "Unknown");
+
+constexpr EnumText accessThresholdRows[] = {
+    {0, "Barred (PKT access not allowed in the Cell)"},
+    {1, "Barred"},
+    {2, "Barred"},
+    {3, "1 Only"},
+    {4, "1 to 2"},
+    {5, "1 to 3"},
+    {6, "1 to 4"},
+    {7, "Allowed"},
+    {255, "Not Available"},
+};
+constexpr EnumTexts accessThresholds(accessThresholdRows, "Unknown");
+
+constexpr Field cellOptionFields[] = {
+    {"Network Control Order", u8At(15), text(controlOrders)},
+    {"PFC Supported", u8At(13), text(pfcSupport)},
+    {"Priority Access Threshold", u8At(14), text(accessThresholds)},
+};
+constexpr Layout cellOptions = layout(18, cellOptionFields); // 0x51F5
+
+constexpr EnumText t3192Rows[] = {
+    {0, "500 ms"}, {1, "1000 ms"}, {2, "1500 ms"}, {3, "0 ms"},
+    {4, "80 ms"},  {5, "120 ms"},  {6, "160 ms"},  {7, "200 ms"},
+};
+constexpr EnumTexts t3192(t3192Rows, "?? ms");
+
+constexpr Field timerFields[] = {
+    {"T3192", u8At(15), text(t3192)},
+    {"Access Burst Type", u8At(17), flag("11-bit format", "8-bit format")},
+    {"DRX Timer Max", u8At(16), integer("%d")},
+};
+constexpr Layout timers = layout(24, timerFields); // 0x51F6
+
+constexpr Field pbcchFields[] = {
+    {"PBCCH Present", u8At(13), integer("%d")},
+};
+constexpr Layout pbcch = layout(34, pbcchFields); // 0x51FB
+
+constexpr Field systemInformationFields[] = {
+    {"Ext Measurement Order", u8At(16), integer("%d")},
+    {"Packet PSI Status", u8At(13), integer("%d")},
+    {"Packet SI Status", u8At(33), flag("Supported", "Not Supported")},
+    {"Count LR", u8At(14), integer("%d")},
+    {"Count HR", u8At(15), integer("%d")},
+};
+constexpr Layout systemInformation = layout(35, systemInformationFields); // 0x51FD
+
+constexpr Field reselectionFields[] = {
+    {"Cell Reselect Hysteresis", u8At(26), flag("Applied", "Not Applied")},
+};
+constexpr Layout reselection = layout(29, reselectionFields); // 0x5137
+
+constexpr EnumText operatingModeRows[] = {
+    {0, "Class 1"},
+    {1, "Class 2"},
+    {2, "Class 3"},
+};
+constexpr EnumTexts operatingModes(operatingModeRows, "Unknown");
+
+constexpr Field networkFields[] = {
+    {"Network Operating Mode", u8At(13), text(operatingModes)},
+};
+constexpr Layout network = layout(32, networkFields); // 0x7135
+
+} // namespace
+
+void GPRSInformation::updateWithData(const Data& data, std::uint32_t logCode) {
+    logLine(LogPriority::Warning, "GPRSInformation");
+    const Record record(data);
+    switch (logCode) {
+    case 0x51F4: show(record, si13); break;
+    case 0x51F5: show(record, cellOptions); break;
+    case 0x51F6: show(record, timers); break;
+    case 0x51FB: show(record, pbcch); break;
+    case 0x51FD: show(record, systemInformation); break;
+    case 0x5137: show(record, reselection); break;
+    case 0x7135: show(record, network); break;
+    default: unknownLogMessage(logCode);
+    }
+}
+
+} // namespace velmora

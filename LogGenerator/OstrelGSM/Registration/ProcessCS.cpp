@@ -1,0 +1,46 @@
+#include "LogGenerator/OstrelGSM/Registration/ProcessCS.h"
+
+#include "LogGenerator/OstrelGSM/Records.h"
+#include "Platform/SystemLog.h"
+
+namespace velmora {
+
+namespace {
+
+constexpr EnumText subStateRows[] = {
+    {0, "MM_NULL_SUBSTATE"},        {1, "MM_NO_IMSI"},
+    {2, "MM_PLMN_SEARCH"},          {3, "MM_LIMITED_SERVICE"},
+    {4, "MM_ATTEMPTING_TO_UPDATE"}, {5, "MM_LOCATION_UPDATE_NEEDED"},
+    {6, "MM_NO_CELL_AVAILABLE"},    {7, "MM_PLMN_SEARCH_NORMAL_SERVICE"},
+    {8, "MM_NORMAL_SERVICE"},
+};
+constexpr EnumTexts subStates(subStateRows, "Unknown");
+
+constexpr EnumText updateStatusRows[] = {
+    {0, "UPDATED"},
+    {1, "NOT_UPDATED"},
+    {2, "ROAMING_NOT_ALLOWED"},
+    {3, "LOCATION_AREA_NOT_ALLOWED"},
+};
+constexpr EnumTexts updateStatuses(updateStatusRows, "Unknown");
+
+constexpr Field stateFields[] = {
+    {"MM State", u8At(13), text(OstrelGSM::mmStates)},
+    {"MM Sub State", u8At(14), text(subStates)},
+    {"LU Reject Cause", u8At(15), text(updateStatuses)},
+};
+constexpr Layout state = layout(16, stateFields); // 0x7131
+
+} // namespace
+
+void ProcessCS::updateWithData(const Data& data, std::uint32_t logCode) {
+    logLine(LogPriority::Warning, "ProcessCS");
+    const Record record(data);
+    switch (logCode) {
+    case 0x7132: show(record, OstrelGSM::registration); break;
+    case 0x7131: show(record, state); break;
+    default: unknownLogMessage(logCode);
+    }
+}
+
+} // namespace velmora

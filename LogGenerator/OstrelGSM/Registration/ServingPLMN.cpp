@@ -1,0 +1,98 @@
+#include "LogGenerator/OstrelGSM/Registration/ServingPLMN.h"
+
+#include "LogGenerator/Extra/CellFields.h"
+#include "Platform/SystemLog.h"
+#include "Platform/TelephonyService.h"
+
+namespace velmora {
+
+namespace {
+
+constexpr EnumText selectionModeRows[] = {
+    {0, "Automatic"}, {1, "Manual"}, {2, "Limited"}, {3, "LIMITED_ROUTINE_ACQ"}, {4, "LIMITED_MANUAL_ACQ"},
+};
+constexpr EnumTexts selectionModes(selectionModeRows, "Unknown");
+
+constexpr EnumText serviceTypeRows[] = {
+    {0, "NO_SERVICE"}, {1, "CS_ONLY"}, {2, "PS_ONLY"}, {3, "CS_PS_SERVICE"}, {4, "LIMITED_SERVICE"},
+};
+constexpr EnumTexts serviceTypes(serviceTypeRows, "Unknown");
+
+constexpr Field selectionFields[] = {
+    {"PLMN Sel Mod", u8At(14), text(selectionModes)},
+};
+constexpr Layout selection = layout(16, selectionFields); // 0x7132
+
+// The PLMN identity at 15 to 17 comes before these.
+constexpr Field areaFields[] = {
+    {"Location Area Code", u16BigEndianAt(18), integer("%d")},
+    {"Routing Area Code", u8At(20), integer("%d")},
+    {"Service Type", u8At(14), text(serviceTypes)},
+};
+constexpr Layout areas = layout(32, areaFields); // 0x7135
+
+/// A BCD digit as its character; a filler (10 and above) is a blank.
+char digit(unsigned halfByte) {
+    return static_cast<char>(halfByte < 10 ? '0' + halfByte : ' ');
+}
+
+void writeIdentity(Dictionary& node, const Record& record) {
+    // BCD as in 3GPP TS 24.008, 10.5.1.3: two digits a byte, the lower half first, MNC digit 3 in the middle
+    // byte. A two-digit MNC so ends in a blank.
+    const char mcc[] = {digit(record.bits(15, 0, 4)), digit(record.bits(15, 4, 4)),
+                        digit(record.bits(16, 0, 4))};
+    const char mnc[] = {digit(record.bits(17, 0, 4)), digit(record.bits(17, 4, 4)),
+                        digit(record.bits(16, 4, 4))};
+    node.setText("Mobile Country Code", std::string_view(mcc, sizeof mcc));
+    node.setText("Mobile Network Code", std::string_view(mnc, sizeof mnc));
+    writeFields(node, record, areas);
+}
+
+// Plain decimal numbers, so that a leading zero of the MNC is lost, under the labels that 0x7135 writes as
+// three characters: whichever came last is shown.
+constexpr CellField cellFields[] = {
+    {kVoxCellMonitorMCC, CellNumber::Whole, "Mobile Country Code", integer("%d"),
+     "ServingPLMN: Failed to retrieve MCC\n"},
+    {kVoxCellMonitorMNC, CellNumber::Whole, "Mobile Network Code", integer("%d"),
+     "ServingPLMN: Failed to retrieve MNC\n"},
+    {kVoxCellMonitorLAC, CellNumber::Whole, "Location Area Code", integer("%d"),
+     "ServingPLMN: Failed to retrieve LAC\n"},
+};
+
+bool isServingCell(const Cell& cell) {
+    return cell.kind == CellKind(kVoxCellMonitorRadioAccessTechnologyGSM, kVoxCellMonitorCellTypeServing) ||
+           cell.kind == CellKind(kVoxCellMonitorRadioAccessTechnologyUMTS, kVoxCellMonitorCellTypeServing);
+}
+
+} // namespace
+
+void ServingPLMN::updateWithData(const Data& data, std::uint32_t logCode) {
+    logLine(LogPriority::Warning, "Serving PLMN");
+    const Record record(data);
+    switch (logCode) {
+    case 0x7132: show(record, selection); break;
+    case 0x7135: showIdentity(record); break;
+    case 0xFF0001: showServingCell(data); break;
+    default: unknownLogMessage(logCode);
+    }
+}
+
+void ServingPLMN::showIdentity(const Record& record) {
+    if (record.size() < areas.minimumLength)
+        return;
+    showWith<writeIdentity>(record);
+}
+
+void ServingPLMN::showServingCell(const Data& data) {
+    const std::vector<Cell>* cells = cellsOf(data);
+    if (!cells)
+        return;
+    for (const Cell& cell : *cells) {
+        if (!isServingCell(cell))
+            continue;
+        writeCellFields(dictionary(), cell, cellFields);
+        return; // only the first serving cell counts
+    }
+}
+
+} // namespace velmora

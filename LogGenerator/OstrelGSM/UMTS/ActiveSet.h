@@ -1,0 +1,17 @@
+#pragma once
+
+#include "LogGenerator/OstrelGSM/UMTS/SearcherSet.h"
+
+namespace velmora {
+
+/// "Active Set": one row per cell of the UMTS searcher's active set.
+class ActiveSet final : public SearcherSet {
+public:
+    [[nodiscard]] std::string_view getSectionName() const override { return "Active Set"; }
+
+protected:
+    [[nodiscard]] std::string_view traceName() const override { return "ActiveSet"; }
+    void showCells(const Record& record, std::uint32_t logCode) override;
+};
+
+} // namespace velmora

@@ -1,0 +1,11 @@
+#include "LogGenerator/OstrelGSM/UMTS/UMTSRRMeasurement.h"
+
+#include "Platform/SystemLog.h"
+
+namespace velmora {
+
+void UMTSRRMeasurement::updateWithData(const Data&, std::uint32_t) {
+    logLine(LogPriority::Warning, "UMTSRRMeasurement");
+}
+
+} // namespace velmora

@@ -1,0 +1,20 @@
+#include "Platform/Linux/Files/LargeMemory.h"
+
+#include <malloc.h>
+
+namespace velmora {
+
+namespace {
+
+/// In bytes; the size that the library begins with, which setting it keeps it from changing.
+constexpr int smallestLargePiece = 128 * 1024;
+
+} // namespace
+
+void giveBackLargeMemory() {
+#ifdef M_MMAP_THRESHOLD // not every C library keeps any
+    ::mallopt(M_MMAP_THRESHOLD, smallestLargePiece);
+#endif
+}
+
+} // namespace velmora

@@ -1,0 +1,78 @@
+#pragma once
+
+#include "Platform/Linux/LogLimiter.h"
+#include "Platform/Linux/LoopTimer.h"
+#include "Platform/Linux/Ports/PortConnection.h"
+#include "Platform/Linux/Ports/PortNameLock.h"
+#include "Platform/Linux/Ports/PortOptions.h"
+#include "Platform/MessagePort.h"
+
+#include <deque>
+#include <memory>
+#include <string>
+#include <vector>
+
+namespace velmora {
+
+/// A local port: a listening Unix-domain socket named after the port, and the connections that it has
+/// accepted.
+///
+/// Messages are taken in slices: at most 256 messages or a mebibyte a turn of the event loop for the whole
+/// port, connections taking turns, so that no flood starves the rest of the program. Held by shared_ptr; the
+/// callback may invalidate the port or drop the last reference, after which no message is delivered any more.
+/// Destroying the port closes it without calling the invalidation callback. Main thread only, on its event
+/// loop.
+class LinuxLocalPort final : public LocalPort, public std::enable_shared_from_this<LinuxLocalPort> {
+public:
+    /// Takes the name and listens; null when the name's owner lives. The failure says what the system
+    /// refused.
+    static Result<std::shared_ptr<LinuxLocalPort>>
+    create(const std::string& name, MessagePorts::MessageCallback callback, const PortOptions& options);
+
+    ~LinuxLocalPort() override;
+
+    [[nodiscard]] const std::string& name() const override { return _name; }
+    [[nodiscard]] bool isValid() const override { return _socket.get() >= 0; }
+    void attachToMainQueue() override;
+    void setInvalidationCallback(std::function<void(LocalPort&)> callback) override;
+    void invalidate() override;
+
+private:
+    using Connection = std::shared_ptr<PortConnection>;
+    struct Budget {
+        std::size_t messages;
+        std::size_t bytes;
+    };
+    enum class Served { Idle, More, Closed, PortGone };
+
+    LinuxLocalPort(std::string name, MessagePorts::MessageCallback callback, PortOptions options,
+                   PortDirectory directory, PortNameLock lock, FileDescriptor socket);
+
+    void acceptConnections();
+    /// What accept(2) failed with; true when it can go on at once.
+    bool handleAcceptError(int error);
+    void admit(FileDescriptor socket);
+    void queue(const Connection& connection);
+    void serveQueued();
+    Served serve(const Connection& connection, Budget& budget, const std::shared_ptr<LinuxLocalPort>& self);
+    void deliver(PortConnection& connection, const Frame& frame);
+    void refuse(const std::string& reason);
+    void drop(const Connection& connection);
+    void close();
+
+    std::string _name;
+    std::shared_ptr<const MessagePorts::MessageCallback> _callback;
+    std::function<void(LocalPort&)> _invalidationCallback;
+    PortOptions _options;
+    PortDirectory _directory;
+    std::optional<PortNameLock> _lock;
+    FileDescriptor _socket;
+    std::unique_ptr<SocketWatch> _acceptWatch; ///< null until the port is attached
+    LoopTimer _acceptPause;
+    LoopTimer _serve;
+    std::vector<Connection> _connections;
+    std::deque<Connection> _queued; ///< those that may have something to read, in turn
+    LogLimiter _refusals{std::chrono::minutes(1)};
+};
+
+} // namespace velmora

@@ -1,0 +1,55 @@
+#include "Platform/Linux/Ports/LinuxMessagePorts.h"
+
+#include "Platform/Linux/Ports/LinuxLocalPort.h"
+#include "Platform/Linux/Ports/LinuxRemotePort.h"
+#include "Platform/SystemLog.h"
+
+#include <utility>
+
+namespace velmora {
+
+namespace {
+
+/// What stands for a port whose name is taken: it never was valid, gets no message, and leaves the owner
+/// alone.
+class TakenLocalPort final : public LocalPort {
+public:
+    explicit TakenLocalPort(std::string name) : _name(std::move(name)) {}
+    [[nodiscard]] const std::string& name() const override { return _name; }
+    [[nodiscard]] bool isValid() const override { return false; }
+    void attachToMainQueue() override {}
+    void setInvalidationCallback(std::function<void(LocalPort&)>) override {}
+    void invalidate() override {}
+
+private:
+    std::string _name;
+};
+
+void logFailure(const std::string& name, const std::string& reason) {
+    logFormat(LogPriority::Error, "Message port %s: %s", name.c_str(), reason.c_str());
+}
+
+} // namespace
+
+LinuxMessagePorts::LinuxMessagePorts(PortOptions options) : _options(std::move(options)) {}
+
+MessagePorts::Created LinuxMessagePorts::createLocal(const std::string& name, MessageCallback callback) {
+    auto port = LinuxLocalPort::create(name, std::move(callback), _options);
+    if (!port) {
+        logFailure(name, port.reason());
+        return {};
+    }
+    if (!*port)
+        return {std::make_shared<TakenLocalPort>(name), true};
+    return {*std::move(port), false};
+}
+
+std::shared_ptr<RemotePort> LinuxMessagePorts::createRemote(const std::string& name) {
+    auto port = LinuxRemotePort::connect(name, _options);
+    if (port)
+        return *std::move(port);
+    logFailure(name, port.reason());
+    return nullptr;
+}
+
+} // namespace velmora

@@ -1,0 +1,21 @@
+#pragma once
+
+#include "Platform/Linux/Ports/PortOptions.h"
+#include "Platform/MessagePort.h"
+
+namespace velmora {
+
+/// Message ports over Unix-domain stream sockets in one directory of the user's, served by the main thread's
+/// event loop. The ports live on without it. What the system refuses is an error line.
+class LinuxMessagePorts final : public MessagePorts {
+public:
+    explicit LinuxMessagePorts(PortOptions options = {});
+
+    [[nodiscard]] Created createLocal(const std::string& name, MessageCallback callback) override;
+    [[nodiscard]] std::shared_ptr<RemotePort> createRemote(const std::string& name) override;
+
+private:
+    PortOptions _options;
+};
+
+} // namespace velmora

@@ -1,0 +1,77 @@
+#pragma once
+
+#include "Platform/Linux/Files/FileDescriptor.h"
+#include "Platform/Linux/LogLimiter.h"
+#include "Platform/Linux/LoopTimer.h"
+#include "Platform/Linux/Ports/FrameQueue.h"
+#include "Platform/Linux/Ports/FrameReader.h"
+#include "Platform/Linux/Ports/PortOptions.h"
+#include "Platform/Linux/Ports/SocketWatch.h"
+#include "Platform/MessagePort.h"
+
+#include <memory>
+#include <string>
+
+namespace velmora {
+
+/// A connection to somebody's local port.
+///
+/// The end of the connection is noticed by the event loop, by `sendRequest`, and by `isValid` itself, which
+/// asks the system. The invalidation callback comes from the event loop when the connection has ended, and
+/// from `invalidate` directly; not when the port is destroyed. Main thread only, on its event loop.
+class LinuxRemotePort final : public RemotePort, public std::enable_shared_from_this<LinuxRemotePort> {
+public:
+    /// Connects; null when there is no such port. The failure says what went wrong otherwise.
+    static Result<std::shared_ptr<LinuxRemotePort>> connect(const std::string& name,
+                                                            const PortOptions& options);
+
+    ~LinuxRemotePort() override;
+
+    [[nodiscard]] const std::string& name() const override { return _name; }
+    [[nodiscard]] bool isValid() const override;
+    void setInvalidationCallback(std::function<void(RemotePort&)> callback) override;
+    void invalidate() override;
+    /// As RemotePort says; what `post` has queued goes out first, within `sendTimeout`. A connection that
+    /// ends while the message is being sent gives BecameInvalid too.
+    Answer sendRequest(std::int32_t messageId, const Data& payload, std::chrono::nanoseconds sendTimeout,
+                       std::chrono::nanoseconds receiveTimeout, bool wantsReply) override;
+    void post(std::int32_t messageId, const Data& payload) override;
+    [[nodiscard]] std::uint64_t droppedMessages() const override { return _dropped; }
+    [[nodiscard]] std::size_t waitingMessages() const override { return _queue.size(); }
+
+private:
+    using Deadline = std::chrono::steady_clock::time_point;
+
+    LinuxRemotePort(std::string name, FileDescriptor socket, const PortOptions& options);
+
+    [[nodiscard]] std::int32_t sendNow(const Frame& frame, Deadline deadline);
+    [[nodiscard]] Answer awaitReply(std::uint32_t serial, Deadline deadline);
+    /// The reply with that serial out of what has arrived; others are late ones that nobody waits for. A
+    /// frame that cannot be ends the connection.
+    [[nodiscard]] std::optional<Frame> takeReply(std::uint32_t serial);
+    void takeWhatArrived();
+    void flushQueue();
+    void countDropped(std::uint64_t count);
+    void reportDropped();
+    /// Closes the connection; the callback follows from the event loop.
+    void connectionEnded();
+    void close();
+    void callInvalidationCallback();
+
+    std::string _name;
+    std::function<void(RemotePort&)> _invalidationCallback;
+    FileDescriptor _socket;
+    FrameReader _reader;
+    FrameQueue _queue;
+    bool _blocked = false; ///< the socket took no more when last tried
+    std::uint32_t _lastSerial = 0;
+    std::uint64_t _dropped = 0;
+    std::uint64_t _unreported = 0; ///< dropped messages that no line has told of yet
+    LogLimiter _tooLong{std::chrono::seconds(1)};
+    std::unique_ptr<SocketWatch> _readWatch;
+    std::unique_ptr<SocketWatch> _writeWatch;
+    LoopTimer _droppedReport;
+    LoopTimer _ended;
+};
+
+} // namespace velmora

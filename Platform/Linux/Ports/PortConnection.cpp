@@ -1,0 +1,51 @@
+#include "Platform/Linux/Ports/PortConnection.h"
+
+namespace velmora {
+
+namespace {
+
+constexpr std::size_t maximumWaitingReplies = 64;
+constexpr std::size_t maximumWaitingBytes = std::size_t{1} << 20;
+
+} // namespace
+
+PortConnection::PortConnection(FileDescriptor socket)
+    : _socket(std::move(socket)), _readWatch(std::make_unique<SocketWatch>(
+                                      _socket.get(), SocketWatch::For::Reading, [this] { becomeReady(); })) {}
+
+FrameReader::Read PortConnection::read() {
+    if (_broken)
+        return {FrameReader::Outcome::Ended, 0};
+    return _reader.readFrom(_socket.get());
+}
+
+void PortConnection::send(const Frame& frame) {
+    _replies.pushRegardless(frame); // the port makes no reply for a clogged connection
+    flush();
+}
+
+bool PortConnection::isClogged() const {
+    return !_broken && (_replies.size() >= maximumWaitingReplies || _replies.bytes() >= maximumWaitingBytes);
+}
+
+void PortConnection::becomeReady() {
+    // A copy, as the port may let go of the connection meanwhile.
+    const auto ready = _ready;
+    ready();
+}
+
+void PortConnection::flush() {
+    const bool wasClogged = isClogged();
+    const auto flushed = _replies.flush(_socket.get());
+    _broken = flushed == FrameQueue::Flushed::Broken;
+    const bool waiting = !_broken && flushed != FrameQueue::Flushed::All;
+    if (waiting && !_writeWatch)
+        _writeWatch =
+            std::make_unique<SocketWatch>(_socket.get(), SocketWatch::For::Writing, [this] { flush(); });
+    else if (_writeWatch)
+        _writeWatch->setEnabled(waiting);
+    if (_broken || (wasClogged && !isClogged()))
+        becomeReady();
+}
+
+} // namespace velmora

@@ -1,0 +1,54 @@
+#pragma once
+
+#include "Platform/Linux/Files/FileDescriptor.h"
+#include "Platform/Linux/Ports/FrameQueue.h"
+#include "Platform/Linux/Ports/FrameReader.h"
+#include "Platform/Linux/Ports/SocketWatch.h"
+
+#include <functional>
+#include <memory>
+#include <optional>
+#include <utility>
+
+namespace velmora {
+
+/// A connection that a local port has accepted: frames come in, replies go out. Owned by the port, which
+/// decides when it reads. Main thread only.
+class PortConnection {
+public:
+    explicit PortConnection(FileDescriptor socket);
+
+    /// `ready` runs when there may be something to do: bytes to read, room for replies again, or the end of
+    /// the connection (which reading then shows). To be set before the event loop runs again.
+    void setReady(std::function<void()> ready) { _ready = std::move(ready); }
+
+    /// The next frame that has arrived whole, as FrameReader gives it.
+    [[nodiscard]] Result<std::optional<Frame>> next() { return _reader.next(); }
+    /// Reads once; see FrameReader.
+    [[nodiscard]] FrameReader::Read read();
+    /// Lets `ready` run, or not, when bytes arrive. It may when the connection is made.
+    void watchReading(bool enabled) { _readWatch->setEnabled(enabled); }
+
+    /// Sends the frame when the peer takes it. Never blocks.
+    void send(const Frame& frame);
+    /// Whether so much waits for a peer which does not take its replies that no more may be made for it: it
+    /// is not read until it does, so that it can fill nobody's memory but its own.
+    [[nodiscard]] bool isClogged() const;
+
+    /// Set by the port while the connection stands in its list of connections to serve.
+    bool queued = false;
+
+private:
+    void flush();
+    void becomeReady();
+
+    FileDescriptor _socket;
+    std::function<void()> _ready;
+    FrameReader _reader;
+    FrameQueue _replies;
+    bool _broken = false;
+    std::unique_ptr<SocketWatch> _readWatch;
+    std::unique_ptr<SocketWatch> _writeWatch; ///< made when replies have to wait
+};
+
+} // namespace velmora

@@ -1,0 +1,301 @@
+#include "Platform/UTF8.h"
+#include "PropertyLists/BinaryObjectTable.h"
+#include "PropertyLists/PropertyList.h"
+#include "PropertyLists/PropertyListDate.h"
+
+#include <algorithm>
+#include <bit>
+#include <cmath>
+#include <limits>
+#include <string_view>
+
+namespace velmora {
+
+namespace {
+
+/// Reads one list. Objects are looked up by their index in the offset table, again for each reference, so
+/// that no two places of the result share a node. A function that fails returns false and has set the reason.
+class Reader {
+public:
+    Reader(const BinaryObjectTable& table, const PropertyListLimits& limits)
+        : _table(table), _limits(limits), _objectsLeft(limits.maximumObjects),
+          _contentLeft(limits.maximumBytes) {}
+
+    Result<Value> read() {
+        Value root;
+        if (!readObject(_table.topObject(), 1, root))
+            return Failure{_reason};
+        return root;
+    }
+
+private:
+    bool fail(std::string reason) {
+        _reason = std::move(reason);
+        return false;
+    }
+    bool failAt(std::size_t offset, const std::string& reason) {
+        return fail(failureAt(offset, reason).reason);
+    }
+
+    [[nodiscard]] std::size_t bytesLeft(const BinaryObject& object) const {
+        return _table.end() - object.content;
+    }
+
+    bool readObject(std::uint64_t index, std::size_t depth, Value& value);
+    bool readCount(BinaryObject& object);
+    bool expectContent(const BinaryObject& object, std::size_t size);
+    bool readInteger(const BinaryObject& object, Value& value);
+    bool readReal(const BinaryObject& object, Value& value);
+    bool readDate(const BinaryObject& object, Value& value);
+    bool readData(const BinaryObject& object, Value& value);
+    bool readASCII(const BinaryObject& object, Value& value);
+    bool readUTF16(const BinaryObject& object, Value& value);
+    bool readArray(const BinaryObject& object, std::size_t depth, Value& value);
+    bool readDictionary(const BinaryObject& object, std::size_t depth, Value& value);
+    bool enterContainer(const BinaryObject& object, std::size_t depth, std::size_t referencesAnEntry);
+    bool takeContent(const BinaryObject& object, std::size_t size);
+
+    const BinaryObjectTable& _table;
+    const PropertyListLimits& _limits;
+    std::size_t _objectsLeft;
+    /// Bytes that text and data may still take: a short list can refer to a long string very often.
+    std::size_t _contentLeft;
+    std::string _reason;
+    /// Offsets of the arrays and dictionaries that are being read, outermost first.
+    std::vector<std::size_t> _open;
+};
+
+bool Reader::readCount(BinaryObject& object) {
+    const auto done = _table.readCount(object);
+    return done || fail(done.reason());
+}
+
+bool Reader::expectContent(const BinaryObject& object, std::size_t size) {
+    if (size <= bytesLeft(object))
+        return true;
+    return failAt(object.offset, "the object with marker " + hexByte(object.marker) + " needs " +
+                                     std::to_string(size) + " bytes, " + std::to_string(bytesLeft(object)) +
+                                     " are left");
+}
+
+bool Reader::readObject(std::uint64_t index, std::size_t depth, Value& value) {
+    if (_objectsLeft == 0)
+        return fail("the list has more than " + std::to_string(_limits.maximumObjects) + " objects");
+    --_objectsLeft;
+
+    const auto found = _table.object(index);
+    if (!found)
+        return fail(found.reason());
+    BinaryObject object = *found;
+    switch (object.marker >> 4) {
+    case 0x0:
+        if (object.marker != 0x08 && object.marker != 0x09)
+            break;
+        value = object.marker == 0x09;
+        return true;
+    case 0x1: return readInteger(object, value);
+    case 0x2: return readReal(object, value);
+    case 0x3: return readDate(object, value);
+    case 0x4: return readCount(object) && readData(object, value);
+    case 0x5: return readCount(object) && readASCII(object, value);
+    case 0x6: return readCount(object) && readUTF16(object, value);
+    case 0xA: return readCount(object) && readArray(object, depth, value);
+    case 0xD: return readCount(object) && readDictionary(object, depth, value);
+    default: break;
+    }
+    return failAt(object.offset, "marker " + hexByte(object.marker) + " stands for no value that is read");
+}
+
+/// Numbers of 1, 2 and 4 bytes have no sign, those of 8 and 16 have.
+bool Reader::readInteger(const BinaryObject& object, Value& value) {
+    const int power = object.marker & 0x0F;
+    if (power > 4)
+        return failAt(object.offset,
+                      "an integer has marker " + hexByte(object.marker) + ", not 0x10 to 0x14");
+    const std::size_t size = std::size_t{1} << power;
+    if (!expectContent(object, size))
+        return false;
+    if (size == 16) {
+        const std::uint64_t high = _table.numberAt(object.content, 8);
+        const auto low = static_cast<std::int64_t>(_table.numberAt(object.content + 8, 8));
+        if (high != (low < 0 ? std::numeric_limits<std::uint64_t>::max() : 0))
+            return failAt(object.offset, "an integer of 16 bytes does not fit 64 bits");
+        value = low;
+        return true;
+    }
+    value = static_cast<std::int64_t>(_table.numberAt(object.content, size));
+    return true;
+}
+
+bool Reader::readReal(const BinaryObject& object, Value& value) {
+    if (object.marker != 0x22 && object.marker != 0x23)
+        return failAt(object.offset, "a real has marker " + hexByte(object.marker) + ", not 0x22 or 0x23");
+    const std::size_t size = object.marker == 0x22 ? 4 : 8;
+    if (!expectContent(object, size))
+        return false;
+    const std::uint64_t bits = _table.numberAt(object.content, size);
+    value = size == 4 ? static_cast<double>(std::bit_cast<float>(static_cast<std::uint32_t>(bits)))
+                      : std::bit_cast<double>(bits);
+    return true;
+}
+
+bool Reader::readDate(const BinaryObject& object, Value& value) {
+    if (object.marker != 0x33)
+        return failAt(object.offset, "a date has marker " + hexByte(object.marker) + ", not 0x33");
+    if (!expectContent(object, 8))
+        return false;
+    const double seconds = std::floor(std::bit_cast<double>(_table.numberAt(object.content, 8)));
+    const auto secondsTo = [](Date date) { return static_cast<double>((date - binaryDateEpoch).count()); };
+    // Written so that a NaN fails as well.
+    if (!(seconds >= secondsTo(earliestDate) && seconds <= secondsTo(latestDate)))
+        return failAt(object.offset, "a date lies outside the years 0001 to 9999");
+    value = binaryDateEpoch + std::chrono::seconds(static_cast<std::int64_t>(seconds));
+    return true;
+}
+
+bool Reader::takeContent(const BinaryObject& object, std::size_t size) {
+    if (size > _contentLeft)
+        return failAt(object.offset, "text and data, repeated ones counted, have more than " +
+                                         std::to_string(_limits.maximumBytes) + " bytes");
+    _contentLeft -= size;
+    return true;
+}
+
+bool Reader::readData(const BinaryObject& object, Value& value) {
+    if (object.count > bytesLeft(object))
+        return failAt(object.offset, "data has " + std::to_string(object.count) + " bytes, " +
+                                         std::to_string(bytesLeft(object)) + " are left");
+    const auto size = static_cast<std::size_t>(object.count);
+    if (!takeContent(object, size))
+        return false;
+    value = Data::copyOf(_table.bytesAt(object.content, size));
+    return true;
+}
+
+bool Reader::readASCII(const BinaryObject& object, Value& value) {
+    if (object.count > bytesLeft(object))
+        return failAt(object.offset, "a string has " + std::to_string(object.count) + " bytes, " +
+                                         std::to_string(bytesLeft(object)) + " are left");
+    const auto size = static_cast<std::size_t>(object.count);
+    if (!takeContent(object, size))
+        return false;
+    const Bytes bytes = _table.bytesAt(object.content, size);
+    const auto notASCII =
+        std::find_if(bytes.begin(), bytes.end(), [](std::uint8_t byte) { return byte >= 0x80; });
+    if (notASCII != bytes.end())
+        return failAt(object.content + static_cast<std::size_t>(notASCII - bytes.begin()),
+                      "an ASCII string holds " + hexByte(*notASCII));
+    value = Value(std::string(bytes.begin(), bytes.end()));
+    return true;
+}
+
+bool Reader::readUTF16(const BinaryObject& object, Value& value) {
+    if (object.count > (bytesLeft(object)) / 2)
+        return failAt(object.offset, "a string has " + std::to_string(object.count) + " UTF-16 units, " +
+                                         std::to_string(bytesLeft(object)) + " bytes are left");
+    const auto units = static_cast<std::size_t>(object.count);
+    std::string text;
+    for (std::size_t i = 0; i < units; ++i) {
+        const std::size_t offset = object.content + 2 * i;
+        auto character = static_cast<char32_t>(_table.numberAt(offset, 2));
+        if (character >= 0xD800 && character <= 0xDBFF && i + 1 < units) {
+            const auto low = static_cast<char32_t>(_table.numberAt(offset + 2, 2));
+            if (low >= 0xDC00 && low <= 0xDFFF) {
+                character = 0x10000 + ((character - 0xD800) << 10) + (low - 0xDC00);
+                ++i;
+            }
+        }
+        if (!isUnicodeScalar(character))
+            return failAt(offset, "a UTF-16 string holds half a surrogate pair");
+        appendUTF8(text, character);
+    }
+    if (!takeContent(object, text.size()))
+        return false;
+    value = Value(std::move(text));
+    return true;
+}
+
+/// Checks that the container may be read at all: all its references are there, and their objects are within
+/// the limits.
+bool Reader::enterContainer(const BinaryObject& object, std::size_t depth, std::size_t referencesAnEntry) {
+    const std::string_view name = referencesAnEntry == 1 ? "an array" : "a dictionary";
+    const std::size_t left = bytesLeft(object);
+    if (object.count > left / (referencesAnEntry * _table.referenceSize()))
+        return failAt(object.offset, std::string(name) + " has " + std::to_string(object.count) +
+                                         " entries, " + std::to_string(left) + " bytes are left");
+    if (object.count > _objectsLeft / referencesAnEntry)
+        return fail("the list has more than " + std::to_string(_limits.maximumObjects) + " objects");
+    if (std::find(_open.begin(), _open.end(), object.offset) != _open.end())
+        return failAt(object.offset, std::string(name) + " contains itself");
+    if (depth > _limits.maximumDepth)
+        return failAt(object.offset,
+                      std::string(name) + " is nested deeper than " + std::to_string(_limits.maximumDepth));
+    const std::size_t references = static_cast<std::size_t>(object.count) * referencesAnEntry;
+    for (std::size_t i = 0; i < references; ++i) {
+        const std::size_t offset = object.content + i * _table.referenceSize();
+        const std::uint64_t reference = _table.numberAt(offset, _table.referenceSize());
+        if (reference >= _table.objectCount())
+            return failAt(offset, std::string(name) + " refers to object " + std::to_string(reference) +
+                                      " of " + std::to_string(_table.objectCount()));
+    }
+    _open.push_back(object.offset);
+    return true;
+}
+
+bool Reader::readArray(const BinaryObject& object, std::size_t depth, Value& value) {
+    if (!enterContainer(object, depth, 1))
+        return false;
+    const auto count = static_cast<std::size_t>(object.count);
+    auto array = makeArray();
+    array->reserve(count);
+    for (std::size_t i = 0; i < count; ++i) {
+        Value element;
+        if (!readObject(_table.numberAt(object.content + i * _table.referenceSize(), _table.referenceSize()),
+                        depth + 1, element))
+            return false;
+        array->append(std::move(element));
+    }
+    _open.pop_back();
+    value = std::move(array);
+    return true;
+}
+
+bool Reader::readDictionary(const BinaryObject& object, std::size_t depth, Value& value) {
+    if (!enterContainer(object, depth, 2))
+        return false;
+    const auto count = static_cast<std::size_t>(object.count);
+    auto dictionary = makeDictionary();
+    for (std::size_t i = 0; i < count; ++i) {
+        // All keys stand first, then all values.
+        const std::size_t keyReference = object.content + i * _table.referenceSize();
+        const std::size_t valueReference = keyReference + count * _table.referenceSize();
+        Value key;
+        if (!readObject(_table.numberAt(keyReference, _table.referenceSize()), depth + 1, key))
+            return false;
+        const std::string* keyText = key.asString();
+        if (!keyText)
+            return failAt(keyReference, "a dictionary's key is of the kind " +
+                                            std::string(nameOf(key.kind())) + ", not string");
+        Value element;
+        if (!readObject(_table.numberAt(valueReference, _table.referenceSize()), depth + 1, element))
+            return false;
+        dictionary->set(*keyText, std::move(element));
+    }
+    _open.pop_back();
+    value = std::move(dictionary);
+    return true;
+}
+
+} // namespace
+
+Result<Value> readBinaryPropertyList(Bytes input, const PropertyListLimits& limits) {
+    if (input.size() > limits.maximumBytes)
+        return Failure{"the list has " + std::to_string(input.size()) + " bytes, more than " +
+                       std::to_string(limits.maximumBytes)};
+    const auto table = BinaryObjectTable::open(input);
+    if (!table)
+        return Failure{table.reason()};
+    return Reader(*table, limits).read();
+}
+
+} // namespace velmora

@@ -1,0 +1,18 @@
+#include "PropertyLists/PropertyList.h"
+
+#include <algorithm>
+#include <string_view>
+
+namespace velmora {
+
+Result<Value> readPropertyList(Bytes input, const PropertyListLimits& limits) {
+    constexpr std::string_view magic = "bplist";
+    const bool isBinary =
+        input.size() >= magic.size() &&
+        std::equal(magic.begin(), magic.end(), input.begin(), [](char wanted, std::uint8_t found) {
+            return static_cast<std::uint8_t>(wanted) == found;
+        });
+    return isBinary ? readBinaryPropertyList(input, limits) : readXMLPropertyList(input, limits);
+}
+
+} // namespace velmora

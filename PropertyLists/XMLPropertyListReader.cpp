@@ -1,0 +1,315 @@
+#include "PropertyLists/PropertyList.h"
+#include "PropertyLists/PugixmlMemoryBudget.h"
+#include "PropertyLists/XMLScalars.h"
+#include "PropertyLists/XMLText.h"
+
+#include <pugixml.hpp>
+
+#include <algorithm>
+#include <cctype>
+#include <limits>
+#include <new>
+#include <string_view>
+
+namespace velmora {
+
+namespace {
+
+/// What a document may take: a node for each value or key and one for the white space behind it, with room
+/// for comments' and sections' pieces, whatever a caller's limit is.
+std::size_t documentBytes(std::size_t objects) {
+    constexpr std::size_t bytesAnObject = 256;
+    constexpr std::size_t anyDocument = std::size_t{256} * 1024;
+    constexpr std::size_t most = std::numeric_limits<std::size_t>::max() - anyDocument;
+    return (objects > most / bytesAnObject ? most : objects * bytesAnObject) + anyDocument;
+}
+
+/// Text as messages show it.
+std::string quoted(std::string_view text) {
+    constexpr std::size_t longest = 40;
+    if (text.size() <= longest)
+        return "\"" + std::string(text) + "\"";
+    std::size_t end = longest;
+    while (end > 0 && (static_cast<unsigned char>(text[end]) & 0xC0) == 0x80)
+        --end;
+    return "\"" + std::string(text.substr(0, end)) + "...\"";
+}
+
+bool isSpace(std::string_view text) {
+    return std::all_of(text.begin(), text.end(), isXMLSpace);
+}
+
+/// Turns the parsed document into a value. A function that fails returns false and has set the reason.
+class Reader {
+public:
+    Reader(Bytes input, const PropertyListLimits& limits)
+        : _input(input), _limits(limits), _objectsLeft(limits.maximumObjects) {}
+
+    Result<Value> read() {
+        Value root;
+        if (!parse() || !readDocument(root))
+            return Failure{_reason};
+        return root;
+    }
+
+private:
+    bool fail(std::string reason) {
+        _reason = std::move(reason);
+        return false;
+    }
+    bool failAt(std::size_t offset, const std::string& reason) {
+        return fail("offset " + std::to_string(offset) + ": " + reason);
+    }
+    bool failAt(pugi::xml_node node, const std::string& reason) { return failAt(offsetOf(node), reason); }
+
+    /// Where an element's "<", or a piece of text, stands in the input.
+    [[nodiscard]] std::size_t offsetOf(pugi::xml_node node) const {
+        const bool isElement = node.type() == pugi::node_element;
+        const char* start = isElement ? node.name() : node.value();
+        return static_cast<std::size_t>(start - _text.data()) - (isElement ? 1 : 0);
+    }
+
+    bool parse();
+    bool readDocument(Value& value);
+    bool readPlist(pugi::xml_node plist, Value& value);
+    bool readValue(pugi::xml_node element, std::size_t depth, Value& value);
+    bool readArray(pugi::xml_node element, std::size_t depth, Value& value);
+    bool readDictionary(pugi::xml_node element, std::size_t depth, Value& value);
+    bool readScalar(pugi::xml_node element, std::string_view name, Value& value);
+    bool readText(pugi::xml_node element, std::string& text);
+    bool appendUnescaped(std::string_view piece, std::size_t offset, std::string& text);
+    bool takeObject();
+    bool expectNoText(pugi::xml_node element);
+    bool nextElement(pugi::xml_node parent, pugi::xml_node& element);
+
+    Bytes _input;
+    const PropertyListLimits& _limits;
+    std::size_t _objectsLeft;
+    /// The input, which pugixml takes apart in place, and a zero byte. Outlives the document.
+    std::string _text;
+    pugi::xml_document _document;
+    std::string _reason;
+};
+
+bool Reader::parse() {
+    if (_input.size() > _limits.maximumBytes)
+        return fail("the list has " + std::to_string(_input.size()) + " bytes, more than " +
+                    std::to_string(_limits.maximumBytes));
+    _text.resize(_input.size());
+    std::copy(_input.begin(), _input.end(), _text.begin());
+    // This also keeps zero bytes away from pugixml, which ends there.
+    if (const auto offset = firstNotXML(_text))
+        return failAt(*offset, "no character of XML in UTF-8");
+
+    // Text comes as it stands in the document: pugixml would pass unknown references as text and end a string
+    // at "&#0;". White space is kept because it may be part of a string that has comments or sections in it.
+    constexpr unsigned options = pugi::parse_cdata | pugi::parse_eol | pugi::parse_ws_pcdata |
+                                 pugi::parse_embed_pcdata | pugi::parse_fragment;
+    const PugixmlMemoryBudget budget(documentBytes(_limits.maximumObjects));
+    const pugi::xml_parse_result result =
+        _document.load_buffer_inplace(_text.data(), _text.size() + 1, options, pugi::encoding_utf8);
+    if (result)
+        return true;
+    if (result.status == pugi::status_out_of_memory && !budget.isExhausted())
+        throw std::bad_alloc();
+    if (result.status == pugi::status_out_of_memory)
+        return fail("the list has more tags and attributes than " + std::to_string(_limits.maximumObjects) +
+                    " objects need");
+    std::string description = result.description();
+    description[0] = static_cast<char>(std::tolower(static_cast<unsigned char>(description[0])));
+    return failAt(static_cast<std::size_t>(std::max<std::ptrdiff_t>(result.offset, 0)), description);
+}
+
+/// The next element behind `element`, or the first one where that is null; null at the end. Only white space
+/// may stand between elements.
+bool Reader::nextElement(pugi::xml_node parent, pugi::xml_node& element) {
+    element = element ? element.next_sibling() : parent.first_child();
+    while (element && element.type() != pugi::node_element) {
+        const std::string_view text = element.value();
+        if (!isSpace(text))
+            return failAt(element, "text " + quoted(text) + " where an element was wanted");
+        element = element.next_sibling();
+    }
+    return true;
+}
+
+/// The text before an element's first child is kept in the element itself.
+bool Reader::expectNoText(pugi::xml_node element) {
+    const std::string_view text = element.value();
+    if (isSpace(text))
+        return true;
+    return failAt(static_cast<std::size_t>(text.data() - _text.data()),
+                  "text " + quoted(text) + " where an element was wanted");
+}
+
+bool Reader::readDocument(Value& value) {
+    pugi::xml_node root;
+    if (!nextElement(_document.root(), root))
+        return false;
+    if (!root)
+        return fail("the list has no element");
+    const bool good =
+        std::string_view(root.name()) == "plist" ? readPlist(root, value) : readValue(root, 1, value);
+    if (!good || !nextElement(_document.root(), root))
+        return false;
+    return !root || failAt(root, "a second root element <" + std::string(root.name()) + ">");
+}
+
+bool Reader::readPlist(pugi::xml_node plist, Value& value) {
+    pugi::xml_node element;
+    if (!expectNoText(plist) || !nextElement(plist, element))
+        return false;
+    if (!element)
+        return failAt(plist, "<plist> holds no value");
+    if (!readValue(element, 1, value) || !nextElement(plist, element))
+        return false;
+    return !element || failAt(element, "a second value in <plist>");
+}
+
+bool Reader::takeObject() {
+    if (_objectsLeft == 0)
+        return fail("the list has more than " + std::to_string(_limits.maximumObjects) + " objects");
+    --_objectsLeft;
+    return true;
+}
+
+bool Reader::readValue(pugi::xml_node element, std::size_t depth, Value& value) {
+    if (!takeObject())
+        return false;
+    const std::string_view name = element.name();
+    const bool isArray = name == "array";
+    if (!isArray && name != "dict")
+        return readScalar(element, name, value);
+    if (depth > _limits.maximumDepth)
+        return failAt(element, "<" + std::string(name) + "> is nested deeper than " +
+                                   std::to_string(_limits.maximumDepth));
+    if (!expectNoText(element))
+        return false;
+    return isArray ? readArray(element, depth, value) : readDictionary(element, depth, value);
+}
+
+bool Reader::readArray(pugi::xml_node element, std::size_t depth, Value& value) {
+    auto array = makeArray();
+    pugi::xml_node child;
+    while (nextElement(element, child)) {
+        if (!child) {
+            value = std::move(array);
+            return true;
+        }
+        Value entry;
+        if (!readValue(child, depth + 1, entry))
+            return false;
+        array->append(std::move(entry));
+    }
+    return false;
+}
+
+bool Reader::readDictionary(pugi::xml_node element, std::size_t depth, Value& value) {
+    auto dictionary = makeDictionary();
+    std::string key;
+    pugi::xml_node child;
+    while (nextElement(element, child)) {
+        if (!child) {
+            value = std::move(dictionary);
+            return true;
+        }
+        if (std::string_view(child.name()) != "key")
+            return failAt(child, "<" + std::string(child.name()) + "> where a <key> was wanted");
+        const pugi::xml_node keyElement = child;
+        if (!takeObject() || !readText(keyElement, key) || !nextElement(element, child))
+            return false;
+        if (!child)
+            return failAt(keyElement, "the key " + quoted(key) + " has no value");
+        Value entry;
+        if (!readValue(child, depth + 1, entry))
+            return false;
+        dictionary->set(key, std::move(entry));
+    }
+    return false;
+}
+
+bool Reader::readScalar(pugi::xml_node element, std::string_view name, Value& value) {
+    const bool isString = name == "string";
+    const bool isTrue = name == "true";
+    const bool isInteger = name == "integer";
+    const bool isReal = name == "real";
+    const bool isDate = name == "date";
+    if (!isString && !isTrue && !isInteger && !isReal && !isDate && name != "false" && name != "data")
+        return failAt(element, "<" + std::string(name) + "> where a value was wanted");
+
+    std::string text;
+    if (!readText(element, text))
+        return false;
+    const auto wanted = [&](std::string_view what) {
+        return failAt(element,
+                      "<" + std::string(name) + "> holds " + quoted(text) + ", not " + std::string(what));
+    };
+    if (isString) {
+        value = Value(std::move(text));
+        return true;
+    }
+    if (isInteger) {
+        const XMLInteger integer = integerOfXML(text);
+        if (integer.status == XMLInteger::Status::OutOfRange)
+            return wanted("a number of 64 bits");
+        if (integer.status == XMLInteger::Status::NotANumber)
+            return wanted("an integer");
+        value = integer.value;
+        return true;
+    }
+    if (isReal) {
+        const auto real = realOfXML(text);
+        value = real ? Value(*real) : Value();
+        return real || wanted("a real");
+    }
+    if (isDate) {
+        const auto date = dateOfXML(text);
+        value = date ? Value(*date) : Value();
+        return date || wanted("a date like 2026-11-16T05:00:00Z");
+    }
+    if (name == "data") {
+        const auto data = dataOfXML(text);
+        value = data ? Value(*data) : Value();
+        return data || wanted("base64");
+    }
+    value = isTrue;
+    return isSpace(text) || wanted("nothing");
+}
+
+bool Reader::readText(pugi::xml_node element, std::string& text) {
+    text.clear();
+    const std::string_view first = element.value();
+    if (!first.empty() &&
+        !appendUnescaped(first, static_cast<std::size_t>(first.data() - _text.data()), text))
+        return false;
+    for (const pugi::xml_node piece : element.children()) {
+        if (piece.type() == pugi::node_element)
+            return failAt(piece, "<" + std::string(piece.name()) + "> inside <" + element.name() + ">");
+        if (piece.type() == pugi::node_cdata)
+            text += piece.value();
+        else if (!appendUnescaped(piece.value(), offsetOf(piece), text))
+            return false;
+    }
+    return true;
+}
+
+bool Reader::appendUnescaped(std::string_view piece, std::size_t offset, std::string& text) {
+    if (piece.find('&') == std::string_view::npos) {
+        text += piece;
+        return true;
+    }
+    const XMLUnescaped unescaped = unescapedXML(piece);
+    if (!unescaped.text)
+        return failAt(offset,
+                      "the text here has the unknown reference " + quoted(unescaped.unknownReference));
+    text += *unescaped.text;
+    return true;
+}
+
+} // namespace
+
+Result<Value> readXMLPropertyList(Bytes input, const PropertyListLimits& limits) {
+    return Reader(input, limits).read();
+}
+
+} // namespace velmora

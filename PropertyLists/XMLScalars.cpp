@@ -1,0 +1,236 @@
+#include "PropertyLists/XMLScalars.h"
+
+#include "PropertyLists/PropertyListDate.h"
+#include "PropertyLists/XMLText.h"
+
+#include <array>
+#include <charconv>
+#include <cmath>
+#include <cstdio>
+#include <limits>
+
+namespace velmora {
+
+namespace {
+
+constexpr std::string_view base64Digits = "ABCDEFGHIJKLMNOPQRSTUVWXYZabcdefghijklmnopqrstuvwxyz0123456789+/";
+constexpr std::uint8_t notBase64 = 0xFF;
+
+constexpr std::array<std::uint8_t, 256> base64Values = []() {
+    std::array<std::uint8_t, 256> values{};
+    for (auto& value : values)
+        value = notBase64;
+    for (std::size_t i = 0; i < base64Digits.size(); ++i)
+        values[static_cast<unsigned char>(base64Digits[i])] = static_cast<std::uint8_t>(i);
+    return values;
+}();
+
+std::string_view trimmed(std::string_view text) {
+    while (!text.empty() && isXMLSpace(text.front()))
+        text.remove_prefix(1);
+    while (!text.empty() && isXMLSpace(text.back()))
+        text.remove_suffix(1);
+    return text;
+}
+
+/// Takes a sign off the text's front; whether it was a minus.
+bool takeSign(std::string_view& text) {
+    if (text.empty() || (text.front() != '-' && text.front() != '+'))
+        return false;
+    const bool negative = text.front() == '-';
+    text.remove_prefix(1);
+    return negative;
+}
+
+bool isDigit(char character) {
+    return character >= '0' && character <= '9';
+}
+
+/// A number that all the text is, without sign.
+std::optional<char32_t> characterOf(std::string_view digits, int base) {
+    std::uint32_t number = 0;
+    const auto [end, error] = std::from_chars(digits.data(), digits.data() + digits.size(), number, base);
+    if (error != std::errc() || end != digits.data() + digits.size() || !isXMLCharacter(number))
+        return std::nullopt;
+    return number;
+}
+
+/// The character that a reference's name (what stands between "&" and ";") means.
+std::optional<char32_t> referenced(std::string_view name) {
+    if (name == "lt")
+        return U'<';
+    if (name == "gt")
+        return U'>';
+    if (name == "amp")
+        return U'&';
+    if (name == "quot")
+        return U'"';
+    if (name == "apos")
+        return U'\'';
+    if (name.starts_with("#x"))
+        return characterOf(name.substr(2), 16);
+    if (name.starts_with("#"))
+        return characterOf(name.substr(1), 10);
+    return std::nullopt;
+}
+
+} // namespace
+
+XMLInteger integerOfXML(std::string_view text) {
+    text = trimmed(text);
+    const bool negative = takeSign(text);
+    int base = 10;
+    if (text.starts_with("0x") || text.starts_with("0X")) {
+        text.remove_prefix(2);
+        base = 16;
+    }
+    std::uint64_t magnitude = 0;
+    const auto [end, error] = std::from_chars(text.data(), text.data() + text.size(), magnitude, base);
+    if (error == std::errc::invalid_argument || end != text.data() + text.size())
+        return {XMLInteger::Status::NotANumber, 0};
+    constexpr auto largest = static_cast<std::uint64_t>(std::numeric_limits<std::int64_t>::max());
+    if (error != std::errc() || magnitude > largest + (negative ? 1 : 0))
+        return {XMLInteger::Status::OutOfRange, 0};
+    // Negated without sign, since the magnitude of the least number has no positive counterpart.
+    return {XMLInteger::Status::Good, static_cast<std::int64_t>(negative ? 0 - magnitude : magnitude)};
+}
+
+std::optional<double> realOfXML(std::string_view text) {
+    text = trimmed(text);
+    const bool negative = takeSign(text);
+    double magnitude = 0;
+    if (text == "nan") {
+        magnitude = std::numeric_limits<double>::quiet_NaN();
+    } else if (text == "inf" || text == "infinity") {
+        magnitude = std::numeric_limits<double>::infinity();
+    } else {
+        if (text.empty() || !(isDigit(text.front()) || text.front() == '.'))
+            return std::nullopt;
+        const auto [end, error] = std::from_chars(text.data(), text.data() + text.size(), magnitude);
+        if (error != std::errc() || end != text.data() + text.size())
+            return std::nullopt;
+    }
+    return negative ? -magnitude : magnitude;
+}
+
+std::string xmlOfReal(double real) {
+    if (std::isnan(real))
+        return "nan";
+    if (std::isinf(real))
+        return real > 0 ? "+infinity" : "-infinity";
+    char text[32];
+    const auto result = std::to_chars(text, text + sizeof text, real);
+    return std::string(text, result.ptr);
+}
+
+std::optional<Date> dateOfXML(std::string_view text) {
+    constexpr std::string_view form = "0000-00-00T00:00:00Z";
+    if (text.size() != form.size())
+        return std::nullopt;
+    for (std::size_t i = 0; i < form.size(); ++i)
+        if (form[i] == '0' ? !isDigit(text[i]) : text[i] != form[i])
+            return std::nullopt;
+    const auto number = [text](std::size_t offset, std::size_t size) {
+        int result = 0;
+        for (const char digit : text.substr(offset, size))
+            result = 10 * result + (digit - '0');
+        return result;
+    };
+    const std::chrono::year_month_day day(std::chrono::year(number(0, 4)),
+                                          std::chrono::month(static_cast<unsigned>(number(5, 2))),
+                                          std::chrono::day(static_cast<unsigned>(number(8, 2))));
+    const int hours = number(11, 2);
+    const int minutes = number(14, 2);
+    const int seconds = number(17, 2);
+    if (!day.ok() || hours > 23 || minutes > 59 || seconds > 59)
+        return std::nullopt;
+    const Date date = std::chrono::sys_days(day) + std::chrono::hours(hours) + std::chrono::minutes(minutes) +
+                      std::chrono::seconds(seconds);
+    return isPropertyListDate(date) ? std::optional(date) : std::nullopt;
+}
+
+std::string xmlOfDate(Date date) {
+    const auto midnight = std::chrono::floor<std::chrono::days>(date);
+    const std::chrono::year_month_day day(midnight);
+    const std::chrono::hh_mm_ss time(date - midnight);
+    char text[64];
+    std::snprintf(text, sizeof text, "%04d-%02u-%02uT%02d:%02d:%02dZ", static_cast<int>(day.year()),
+                  static_cast<unsigned>(day.month()), static_cast<unsigned>(day.day()),
+                  static_cast<int>(time.hours().count()), static_cast<int>(time.minutes().count()),
+                  static_cast<int>(time.seconds().count()));
+    return text;
+}
+
+std::optional<Data> dataOfXML(std::string_view text) {
+    std::vector<std::uint8_t> bytes;
+    bytes.reserve(text.size() / 4 * 3);
+    std::uint32_t group = 0;
+    std::size_t digits = 0;
+    std::size_t padding = 0;
+    for (const char character : text) {
+        if (isXMLSpace(character))
+            continue;
+        if (character == '=') {
+            ++padding;
+            continue;
+        }
+        const std::uint8_t value = base64Values[static_cast<unsigned char>(character)];
+        if (value == notBase64 || padding > 0)
+            return std::nullopt;
+        group = group << 6 | value;
+        if (++digits % 4 == 0) {
+            bytes.push_back(static_cast<std::uint8_t>(group >> 16 & 0xFF));
+            bytes.push_back(static_cast<std::uint8_t>(group >> 8 & 0xFF));
+            bytes.push_back(static_cast<std::uint8_t>(group & 0xFF));
+        }
+    }
+    const std::size_t rest = digits % 4;
+    if (rest == 1 || padding != (rest == 0 ? 0 : 4 - rest))
+        return std::nullopt;
+    if (rest >= 2)
+        bytes.push_back(static_cast<std::uint8_t>(group >> (rest == 2 ? 4 : 10) & 0xFF));
+    if (rest == 3)
+        bytes.push_back(static_cast<std::uint8_t>(group >> 2 & 0xFF));
+    return Data(std::move(bytes));
+}
+
+void appendXMLOfData(std::string& output, Bytes bytes, std::string_view indent) {
+    constexpr std::size_t bytesALine = 57;
+    while (!bytes.empty()) {
+        Bytes line = bytes.first(std::min(bytesALine, bytes.size()));
+        bytes = bytes.subspan(line.size());
+        output += indent;
+        for (; !line.empty(); line = line.subspan(std::min<std::size_t>(3, line.size()))) {
+            std::uint32_t group = 0;
+            for (std::size_t i = 0; i < 3; ++i)
+                group = group << 8 | (i < line.size() ? line[i] : 0U);
+            for (std::size_t i = 0; i < 4; ++i)
+                output += i <= line.size() ? base64Digits[group >> (18 - 6 * i) & 0x3F] : '=';
+        }
+        output += '\n';
+    }
+}
+
+XMLUnescaped unescapedXML(std::string_view text) {
+    std::string result;
+    result.reserve(text.size());
+    while (!text.empty()) {
+        const std::size_t start = text.find('&');
+        result += text.substr(0, start);
+        if (start == std::string_view::npos)
+            break;
+        text.remove_prefix(start);
+        // The longest name with a meaning has eight characters ("#x10FFFF"); leading zeros are let pass.
+        constexpr std::size_t longest = 32;
+        const std::size_t end = text.substr(0, longest).find(';');
+        const auto character =
+            end == std::string_view::npos ? std::nullopt : referenced(text.substr(1, end - 1));
+        if (!character)
+            return {std::nullopt, text.substr(0, end == std::string_view::npos ? 1 : end + 1)};
+        appendUTF8(result, *character);
+        text.remove_prefix(end + 1);
+    }
+    return {std::move(result), {}};
+}
+
+} // namespace velmora

@@ -1,0 +1,65 @@
+#pragma once
+
+#include "Platform/Bytes.h"
+#include "Platform/Result.h"
+#include "Recording/Files/ByteSource.h"
+
+#include <cstddef>
+#include <cstdint>
+#include <memory>
+#include <optional>
+#include <vector>
+
+namespace velmora {
+
+/// A moving window on a source of any length, for readers that look ahead a bounded way and hand parts of
+/// what they see out without a copy.
+///
+/// The bytes lie in chunks. `part` gives a window on the chunk itself: it stays good after the input has
+/// moved on, but keeps its whole chunk in memory; who keeps one for long, copies it. A chunk that nobody
+/// holds a part of is used again. Chunks have the given size, but where one look-ahead asks for more: then
+/// they grow with the bytes that come, up to about twice what it asked for. Main thread only.
+class ChunkedInput {
+public:
+    /// Two of them come to much less than a mebibyte, so that the second, which is made once the first has
+    /// been read through, is no growth to speak of; larger ones are not read faster.
+    static constexpr std::size_t defaultChunkSize = std::size_t{256} << 10;
+
+    explicit ChunkedInput(std::unique_ptr<ByteSource> source, std::size_t chunkSize = defaultChunkSize);
+
+    /// Reads until `count` bytes are available. False when the input ends, or fails, before.
+    [[nodiscard]] bool ensure(std::size_t count) { return available().size() >= count || fill(count); }
+    /// The bytes that have been read and not skipped. Valid until the next `ensure`.
+    [[nodiscard]] Bytes available() const { return {_chunk->data() + _begin, _end - _begin}; }
+    /// Bytes skipped so far: where in the input the available ones begin.
+    [[nodiscard]] std::uint64_t offset() const { return _offset; }
+    /// Precondition: `count` bytes are available.
+    void skip(std::size_t count) {
+        _begin += count;
+        _offset += count;
+    }
+    /// A window on the available bytes. Precondition: it lies inside them.
+    [[nodiscard]] Data part(std::size_t offset, std::size_t length) const {
+        return Data(_chunk, _begin + offset, length);
+    }
+    /// The read error that ended the input; absent while there was none.
+    [[nodiscard]] const std::optional<Failure>& failure() const { return _failure; }
+
+private:
+    using Chunk = std::shared_ptr<std::vector<std::uint8_t>>;
+
+    bool fill(std::size_t count);
+    void turnOver(std::size_t count);
+
+    std::unique_ptr<ByteSource> _source;
+    std::size_t _chunkSize;
+    Chunk _chunk;
+    Chunk _spare; ///< the chunk before, for when it is given back before the present one
+    std::size_t _begin = 0;
+    std::size_t _end = 0;
+    std::uint64_t _offset = 0;
+    bool _ended = false;
+    std::optional<Failure> _failure;
+};
+
+} // namespace velmora

@@ -1,0 +1,28 @@
+#pragma once
+
+#include "Recording/Files/ByteSource.h"
+
+#include "Platform/Bytes.h"
+
+#include <algorithm>
+#include <utility>
+
+namespace velmora {
+
+/// Bytes that are in memory already. Main thread only.
+class DataSource final : public ByteSource {
+public:
+    explicit DataSource(Data data) : _rest(std::move(data)) {}
+
+    Result<std::size_t> read(std::span<std::uint8_t> buffer) override {
+        const std::size_t count = std::min(buffer.size(), _rest.size());
+        std::copy_n(_rest.bytes().begin(), count, buffer.begin());
+        _rest = _rest.from(count);
+        return count;
+    }
+
+private:
+    Data _rest;
+};
+
+} // namespace velmora

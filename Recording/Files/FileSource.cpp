@@ -1,0 +1,43 @@
+#include "Recording/Files/FileSource.h"
+
+#include <cerrno>
+#include <system_error>
+
+#include <fcntl.h>
+#include <poll.h>
+#include <unistd.h>
+
+namespace velmora {
+
+Result<std::unique_ptr<ByteSource>> FileSource::open(const std::string& path) {
+    if (path == "-")
+        return std::unique_ptr<ByteSource>(std::make_unique<FileSource>(STDIN_FILENO, false));
+    const int descriptor = ::open(path.c_str(), O_RDONLY | O_CLOEXEC);
+    if (descriptor < 0)
+        return Failure{"cannot open: " + std::generic_category().message(errno)};
+    return std::unique_ptr<ByteSource>(std::make_unique<FileSource>(descriptor, true));
+}
+
+FileSource::FileSource(int descriptor, bool owned) : _descriptor(descriptor), _owned(owned) {}
+
+FileSource::~FileSource() {
+    if (_owned)
+        ::close(_descriptor);
+}
+
+Result<std::size_t> FileSource::read(std::span<std::uint8_t> buffer) {
+    for (;;) {
+        const ssize_t count = ::read(_descriptor, buffer.data(), buffer.size());
+        if (count >= 0)
+            return static_cast<std::size_t>(count);
+        if (errno == EAGAIN || errno == EWOULDBLOCK) {
+            // Standard input may have been left non-blocking by whoever shares it.
+            pollfd readable{_descriptor, POLLIN, 0};
+            ::poll(&readable, 1, -1);
+        } else if (errno != EINTR) {
+            return Failure{"cannot read: " + std::generic_category().message(errno)};
+        }
+    }
+}
+
+} // namespace velmora

@@ -1,0 +1,30 @@
+#pragma once
+
+#include "Recording/Files/ByteSource.h"
+
+#include <memory>
+#include <string>
+
+namespace velmora {
+
+/// The bytes of an open file, pipe or terminal. Owns the descriptor unless told otherwise. Main thread only.
+class FileSource final : public ByteSource {
+public:
+    /// Opens the file; "-" is standard input, which stays open afterwards. The reason does not repeat the
+    /// path.
+    static Result<std::unique_ptr<ByteSource>> open(const std::string& path);
+
+    /// Reads an open descriptor, and closes it in the end when `owned`.
+    FileSource(int descriptor, bool owned);
+    ~FileSource() override;
+    FileSource(const FileSource&) = delete;
+    FileSource& operator=(const FileSource&) = delete;
+
+    Result<std::size_t> read(std::span<std::uint8_t> buffer) override;
+
+private:
+    int _descriptor;
+    bool _owned;
+};
+
+} // namespace velmora

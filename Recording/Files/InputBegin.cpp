@@ -1,0 +1,19 @@
+#include "Recording/Files/InputBegin.h"
+
+#include <algorithm>
+#include <cstddef>
+
+namespace velmora {
+
+std::string unexpectedBegin(Bytes begin, std::string_view wanted) {
+    constexpr std::size_t shown = 12;
+    std::string text = begin.empty() ? "empty" : "begins ";
+    constexpr char digits[] = "0123456789ABCDEF";
+    for (const std::uint8_t byte : begin.first(std::min(begin.size(), shown)))
+        text += {digits[byte >> 4], digits[byte & 0xF], ' '};
+    text += begin.empty() ? ", wanted " : "(hex), wanted ";
+    text += wanted;
+    return text;
+}
+
+} // namespace velmora

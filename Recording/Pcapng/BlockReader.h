@@ -1,0 +1,65 @@
+#pragma once
+
+#include "Recording/Files/ChunkedInput.h"
+#include "Recording/MessageReader.h"
+
+#include <cstddef>
+#include <cstdint>
+#include <optional>
+#include <string>
+#include <utility>
+
+namespace velmora {
+
+/// Takes a pcapng file apart into its blocks. Where a block does not hold together, goes on at the next one
+/// that does: they lie on 4-byte boundaries, but a section header is looked for at every byte, so that a
+/// recording appended to one that was cut off is found. Main thread only.
+class BlockReader {
+public:
+    struct Block {
+        std::uint32_t type = 0;
+        std::uint32_t length = 0;
+        bool bigEndian = false;   ///< the byte order of its section
+        std::uint64_t offset = 0; ///< where in the file it begins
+        Bytes bytes;              ///< all of it
+
+        /// What stands between its first length and its last.
+        [[nodiscard]] Bytes body() const;
+    };
+
+    /// Blocks above this many bytes are taken for damage: the longest message, with a MiB for a block's
+    /// options.
+    static constexpr std::size_t maximumBlockSize = maximumMessageSize + (std::size_t{1} << 20);
+
+    explicit BlockReader(ChunkedInput input) : _input(std::move(input)) {}
+
+    /// Whether the input begins as a pcapng file does; to be asked before the first `next`.
+    [[nodiscard]] Result<Done> expectSection();
+    /// The next whole block, good until the next call; null at the end, or when reading failed, and ever
+    /// after.
+    [[nodiscard]] const Block* next();
+    /// What was left out before the block, or the end, that `next` last gave; without its record number.
+    [[nodiscard]] bool hasLoss() const { return _loss.has_value(); }
+    [[nodiscard]] std::optional<Loss> takeLoss() { return std::exchange(_loss, std::nullopt); }
+    /// A shared window on the block that `next` last gave. Precondition: it lies inside the block.
+    [[nodiscard]] Data part(std::size_t offset, std::size_t length) const {
+        return _input.part(offset, length);
+    }
+    /// The read error that ended the input; absent while there was none.
+    [[nodiscard]] const std::optional<Failure>& failure() const { return _input.failure(); }
+
+private:
+    enum class Fault : std::uint8_t { None, CutOff, NoByteOrder, Length, TrailingLength };
+
+    [[nodiscard]] Fault examine(Block& block);
+    [[nodiscard]] std::string describe(Fault fault, const Block& block) const;
+    void passDamage(Fault fault, const Block& block);
+    [[nodiscard]] bool standsAtBlock();
+
+    ChunkedInput _input;
+    Block _present; ///< what `next` last gave
+    bool _bigEndian = false;
+    std::optional<Loss> _loss;
+};
+
+} // namespace velmora

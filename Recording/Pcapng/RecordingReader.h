@@ -1,0 +1,88 @@
+#pragma once
+
+#include "Recording/Files/ChunkedInput.h"
+#include "Recording/MessageReader.h"
+#include "Recording/Pcapng/BlockReader.h"
+#include "Recording/Pcapng/InterfaceDescription.h"
+
+#include <cstdint>
+#include <memory>
+#include <optional>
+#include <string>
+#include <utility>
+#include <vector>
+
+namespace velmora {
+
+/// Reads a recording: a pcapng file whose packets, on interfaces of link type 147, are log messages.
+///
+/// Takes what capture tools make of recordings when they cut and merge them: both byte orders, several
+/// sections and interfaces, any time resolution, all three kinds of packet blocks; blocks without packets are
+/// passed over. An interface's name is its technology. The first one named is the recording's; messages of
+/// interfaces without a name belong to it as well, those of another technology are losses. Interfaces of
+/// other link types are counted and otherwise left alone.
+///
+/// Where a block is damaged, reading goes on at the next block that holds together. Memory is bounded
+/// whatever the file holds; a message is a window on the reader's 1 MiB chunk and keeps that alive: who keeps
+/// messages for long, copies them. A message's number is the packet's place in the file, as capture tools
+/// count. Main thread only.
+class RecordingReader final : public MessageReader {
+public:
+    /// What was passed over because it is none of ours.
+    struct PassedOver {
+        std::uint64_t interfaces = 0; ///< of another link type
+        std::uint64_t packets = 0;    ///< on such interfaces
+    };
+
+    /// Opens a file, "-" being standard input, and reads up to its first interface of log messages, or its
+    /// first packet. Fails when it cannot be read or is no pcapng file; the reason does not repeat the path.
+    static Result<std::unique_ptr<RecordingReader>> open(const std::string& path);
+    /// As above, for an input of which nothing has been skipped.
+    static Result<std::unique_ptr<RecordingReader>> open(ChunkedInput input);
+
+    [[nodiscard]] std::optional<LoggedMessage> next() override;
+    [[nodiscard]] const std::string& technology() const override { return _technology; }
+    [[nodiscard]] const std::optional<Failure>& failure() const override { return _blocks.failure(); }
+    [[nodiscard]] const PassedOver& passedOver() const { return _passedOver; }
+
+private:
+    using Block = BlockReader::Block;
+
+    struct Interface {
+        enum class Use : std::uint8_t { Messages, OtherTechnology, OtherLinkType, Unreadable };
+        Use use = Use::Messages;
+        InterfaceDescription description;
+    };
+
+    /// A packet block's fields, whichever of the three kinds it is.
+    struct Packet {
+        std::uint32_t interface = 0;
+        bool hasStamp = false; ///< simple packets have none
+        std::uint64_t stamp = 0;
+        std::size_t offset = 0;     ///< where in the block its bytes begin
+        std::uint32_t captured = 0; ///< bytes in the block
+        std::uint32_t original = 0; ///< bytes of the message
+    };
+
+    explicit RecordingReader(ChunkedInput input) : _blocks(std::move(input)) {}
+
+    [[nodiscard]] const Block* nextBlock();
+    void takeIn(const Block& block);
+    void takeInInterface(const Block& block);
+    /// Makes the message of a packet, unless it is none of ours or lost.
+    void takeMessage(const Block& block, std::optional<LoggedMessage>& message);
+    [[nodiscard]] Packet packetOf(const Block& block) const;
+    [[nodiscard]] std::string whyUnusable(const Packet& packet, const Block& block) const;
+    void lose(const Block& block, std::uint64_t number, std::string reason);
+
+    BlockReader _blocks;
+    const Block* _waiting = nullptr;    ///< the packet that `open` came upon
+    std::vector<Interface> _interfaces; ///< of the present section
+    bool _settled = false;              ///< an interface of log messages has been met
+    std::string _technology;
+    std::uint64_t _packets = 0; ///< packet blocks met
+    Time _lastTime{};
+    PassedOver _passedOver;
+};
+
+} // namespace velmora

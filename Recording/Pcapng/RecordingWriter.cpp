@@ -1,0 +1,206 @@
+#include "Recording/Pcapng/RecordingWriter.h"
+
+#include "Platform/TelephonyService.h"
+#include "Recording/Files/DescriptorFile.h"
+#include "Recording/MessageReader.h"
+
+#include <algorithm>
+#include <cerrno>
+#include <system_error>
+#include <utility>
+
+#include <fcntl.h>
+#include <unistd.h>
+
+namespace velmora {
+
+namespace {
+
+constexpr std::size_t flushThreshold = std::size_t{64} << 10;
+constexpr std::size_t maximumTechnology = 255;
+
+bool mayPass(int error) {
+    constexpr int passing[] = {ENOSPC, EDQUOT, EFBIG, EIO, EROFS};
+    return std::find(std::begin(passing), std::end(passing), error) != std::end(passing);
+}
+
+} // namespace
+
+Result<std::unique_ptr<RecordingWriter>> RecordingWriter::create(const std::string& path,
+                                                                 std::string_view technology) {
+    if (path == "-")
+        return start(std::make_unique<DescriptorFile>(STDOUT_FILENO, false), "standard output", technology);
+    const int descriptor = ::open(path.c_str(), O_WRONLY | O_CREAT | O_TRUNC | O_CLOEXEC, 0666);
+    if (descriptor < 0)
+        return Failure{"cannot create " + path + ": " + std::generic_category().message(errno)};
+    return adopt(descriptor, path, technology);
+}
+
+Result<std::unique_ptr<RecordingWriter>> RecordingWriter::adopt(int descriptor, std::string name,
+                                                                std::string_view technology) {
+    return start(std::make_unique<DescriptorFile>(descriptor, true), std::move(name), technology);
+}
+
+Result<std::unique_ptr<RecordingWriter>>
+RecordingWriter::start(std::unique_ptr<RecordingFile> file, std::string name, std::string_view technology) {
+    std::unique_ptr<RecordingWriter> writer(new RecordingWriter(std::move(file), std::move(name)));
+    const std::string_view shortName = shortTechnologyName(technology);
+    if (shortName.size() > maximumTechnology)
+        return Failure{"technology name of " + std::to_string(shortName.size()) + " bytes, wanted at most " +
+                       std::to_string(maximumTechnology)};
+    recordingBlocks::appendHead(writer->_buffer, shortName);
+    if (const Result<Done> written = writer->flush(); !written && !writer->isWaiting())
+        return Failure{written.reason()};
+    return writer;
+}
+
+RecordingWriter::RecordingWriter(std::unique_ptr<RecordingFile> file, std::string name)
+    : _file(std::move(file)), _name(std::move(name)) {
+    _buffer.reserve(2 * flushThreshold);
+}
+
+RecordingWriter::~RecordingWriter() {
+    const Result<Done> closed = close();
+    static_cast<void>(closed); // whoever wants to know has closed it before
+}
+
+Result<Done> RecordingWriter::append(Time time, Bytes message) {
+    if (_failure)
+        return *_failure;
+    if (message.size() > maximumMessageSize)
+        return Failure{"message of " + std::to_string(message.size()) + " bytes, wanted at most " +
+                       std::to_string(maximumMessageSize)};
+    const std::size_t length = recordingBlocks::packetSize(message.size());
+    // What has been gathered goes out ahead of a long message, so that the buffer need not hold both.
+    if (!_trouble && !waiting().empty() && waiting().size() + length > 2 * flushThreshold) {
+        if (Result<Done> written = flush(); !written && !_trouble)
+            return written;
+    }
+    _dropping = _dropping || (_trouble && waiting().size() + length > maximumQueue);
+    if (_dropping) {
+        ++_dropped;
+        return *_trouble;
+    }
+    recordingBlocks::appendPacket(_buffer, time, message);
+    ++_messages;
+    return _trouble || waiting().size() < flushThreshold ? outcome() : flush();
+}
+
+Result<Done> RecordingWriter::flush() {
+    if (_failure)
+        return *_failure;
+    // What trouble has left behind the last whole block goes first.
+    if (const int error = _trouble ? _file->cutTo(_end) : 0; error != 0) {
+        stumble("write", error);
+        return outcome();
+    }
+    for (Bytes rest = waiting(); !rest.empty();) {
+        const RecordingFile::Written written = _file->write(rest);
+        if (written.error != 0) {
+            stumble("write", written.error);
+            return outcome();
+        }
+        _end += written.bytes;
+        rest = rest.subspan(written.bytes);
+    }
+    _trouble.reset();
+    _dropping = false;
+    if (!_keeps || written() > maximumKept)
+        forget(written());
+    return Done{};
+}
+
+Result<Done> RecordingWriter::sync() {
+    _keeps = _file->isRegular();
+    // A medium that failed is tried again by the next call, so that this one tells of it.
+    if (!takeSyncOutcome())
+        return outcome();
+    if (Result<Done> flushed = flush(); !flushed)
+        return flushed;
+    if (_keeps && !_syncIsUnderWay && _synced < _end) {
+        _file->startSync();
+        _syncIsUnderWay = true;
+        _syncing = _end;
+    }
+    return Done{};
+}
+
+Result<Done> RecordingWriter::close() {
+    if (!_file)
+        return outcome();
+    Result<Done> flushed = flush();
+    // Where all that the medium refused has been kept, it gets a second try.
+    if (flushed && _file->isRegular() && !settle() && _base == _synced && (flushed = flush()))
+        static_cast<void>(settle());
+    if (const int error = _file->close(); error != 0 && outcome())
+        _failure = failureOf("close", error);
+    _file.reset();
+    return outcome();
+}
+
+recordingBlocks::PacketCount RecordingWriter::unsaved() const {
+    return recordingBlocks::countPackets(waiting());
+}
+
+Result<Done> RecordingWriter::outcome() const {
+    if (_failure)
+        return *_failure;
+    if (_trouble)
+        return *_trouble;
+    return Done{};
+}
+
+bool RecordingWriter::takeSyncOutcome() {
+    const std::optional<int> error = _syncIsUnderWay ? _file->takeSyncOutcome() : std::nullopt;
+    if (!error)
+        return true;
+    _syncIsUnderWay = false;
+    return takeMediumsWord(*error, _syncing);
+}
+
+bool RecordingWriter::settle() {
+    _syncIsUnderWay = false;
+    return takeMediumsWord(_file->sync(), _end);
+}
+
+bool RecordingWriter::takeMediumsWord(int error, std::uint64_t end) {
+    // Some file systems have nothing to put anywhere, and say so.
+    if (mayPass(error)) {
+        // What is not known to be on the medium is written once more.
+        _end = _base;
+        stumble("write", error);
+        return false;
+    }
+    _synced = end;
+    if (end > _base)
+        forget(static_cast<std::size_t>(end - _base));
+    return true;
+}
+
+void RecordingWriter::stumble(const char* operation, int error) {
+    _end = _base + recordingBlocks::wholeBlocks(_buffer, written());
+    const bool passing = mayPass(error) && _file->isRegular();
+    const int cutError = passing ? _file->cutTo(_end) : 0;
+    if (passing && (cutError == 0 || mayPass(cutError))) {
+        _trouble = failureOf(operation, error);
+        return;
+    }
+    _trouble.reset();
+    _failure = failureOf(operation, error);
+}
+
+Failure RecordingWriter::failureOf(const char* operation, int error) const {
+    return Failure{std::string("cannot ") + operation + " " + _name + ": " +
+                   std::generic_category().message(error)};
+}
+
+void RecordingWriter::forget(std::size_t length) {
+    _buffer.erase(_buffer.begin(), _buffer.begin() + static_cast<std::ptrdiff_t>(length));
+    _base += length;
+    if (_buffer.empty() && _buffer.capacity() > maximumKept) { // a long queue's room
+        _buffer.shrink_to_fit();
+        _buffer.reserve(2 * flushThreshold);
+    }
+}
+
+} // namespace velmora

@@ -1,0 +1,152 @@
+#include "Telephony/Drives/C2K/C2KScenario.h"
+
+#include "Platform/TelephonyService.h"
+
+namespace velmora {
+
+using namespace records;
+
+namespace {
+
+constexpr double reselectionMargin_dB = 3;
+constexpr double reselectionTime_s = 2;
+
+} // namespace
+
+/// The round.
+const DriveScenario::Phase C2KScenario::phases[] = {
+    {20, &C2KScenario::powerOn},    // and the session's negotiation
+    {30, nullptr},                  // idle on both
+    {50, &C2KScenario::connect},    // EV-DO
+    {15, &C2KScenario::disconnect}, // idle
+    {45, &C2KScenario::startCall},  // 1x
+    {25, &C2KScenario::endCall},    // idle, EV-DO after a while
+    {30, &C2KScenario::connect},    // EV-DO
+    {15, &C2KScenario::disconnect}, // idle
+    {6, &C2KScenario::powerOff},    // until the next round
+};
+
+C2KScenario::C2KScenario(std::uint64_t seed)
+    : DriveScenario(seed ^ 0xC2C2, phases), _network(seed), _context{_phone, _network, random()} {}
+
+std::string_view C2KScenario::technology() const {
+    return kVoxLogChannelTechnology_Ostrel_CDMA;
+}
+
+void C2KScenario::powerOn() {
+    say1x(0.5, OneXState::PowerUp);
+    say1x(1.2, OneXState::Initial);
+    say(2.0, [this] {
+        _phone.oneX = OneXState::Acquisition;
+        return systemReport(_context);
+    });
+    say1x(3.5, OneXState::Sync);
+    say(4.6, [this] {
+        if (!_network.pilots().empty())
+            _phone.serving = _network.pilots().front();
+        _phone.oneX = OneXState::Paging;
+        return systemReport(_context);
+    });
+    sayEVDO(6, EVDOState::Acquisition);
+    sayEVDO(7.5, EVDOState::Sync);
+    sayEVDO(8.4, EVDOState::Idle);
+    saySession(9, EVDOSession::AMPSetup);
+    say(10.2, [this] {
+        _phone.session = EVDOSession::ATInitiated;
+        _phone.uati = random().between(0, 0xFFFFFF);
+        return evdoStatusReport(_context);
+    });
+    saySession(11.5, EVDOSession::Initiated);
+    saySession(13, EVDOSession::Open);
+}
+
+void C2KScenario::connect() {
+    sayEVDO(0.3, EVDOState::Access);
+    sayEVDO(1.5, EVDOState::Connected);
+}
+
+void C2KScenario::disconnect() {
+    sayEVDO(0.3, EVDOState::Idle);
+}
+
+void C2KScenario::startCall() {
+    sayEVDO(0.2, EVDOState::Inactive);
+    say1x(0.4, OneXState::Paging);
+    say1x(2.5, OneXState::Traffic);
+}
+
+void C2KScenario::endCall() {
+    say1x(0.3, OneXState::Paging);
+    sayEVDOReturn(3);
+}
+
+void C2KScenario::powerOff() {
+    saySession(0.3, EVDOSession::Closed);
+    sayEVDO(0.5, EVDOState::Inactive);
+    say(0.9, [this] {
+        _phone.oneX = OneXState::Inactive;
+        _phone.serving.reset();
+        return oneXStatusReport(_context);
+    });
+}
+
+void C2KScenario::say1x(double delay, OneXState state) {
+    say(delay, [this, state] {
+        _phone.oneX = state;
+        return oneXStatusReport(_context);
+    });
+}
+
+void C2KScenario::sayEVDO(double delay, EVDOState state) {
+    say(delay, [this, state] {
+        _phone.evdo = state;
+        return evdoStatusReport(_context);
+    });
+}
+
+void C2KScenario::saySession(double delay, EVDOSession session) {
+    say(delay, [this, session] {
+        _phone.session = session;
+        return evdoStatusReport(_context);
+    });
+}
+
+void C2KScenario::sayEVDOReturn(double delay) {
+    sayEVDO(delay, EVDOState::Acquisition);
+    sayEVDO(delay + 1.5, EVDOState::Sync);
+    sayEVDO(delay + 2.5, EVDOState::Idle);
+}
+
+void C2KScenario::drive(double seconds) {
+    _network.drive(seconds);
+    if (!_phone.serving)
+        return;
+    for (const C2KPilot& pilot : _network.pilots())
+        if (pilot.sector.sid == _phone.serving->sector.sid &&
+            pilot.sector.pnOffset == _phone.serving->sector.pnOffset) {
+            _phone.serving = pilot;
+            return;
+        }
+    // It has gone below the receiver's sensitivity.
+    _phone.serving = C2KPilot{_phone.serving->sector};
+}
+
+void C2KScenario::react() {
+    const bool better =
+        _phone.serving && !_network.pilots().empty() &&
+        _network.pilots().front().level_dBm >= _phone.serving->level_dBm + reselectionMargin_dB;
+    if (timeToReselect(better, reselectionTime_s)) {
+        _phone.serving = _network.pilots().front();
+        say(0.1, [this] { return systemReport(_context); });
+    }
+}
+
+void C2KScenario::addReports(DriveScript& due) {
+    schedule(c2kReports(), _context, 0.037, due);
+}
+
+DamageMaterial C2KScenario::damageMaterial(std::size_t number) {
+    return c2kDamageMaterial(_context, number / everyDamage.size());
+}
+
+} // namespace velmora

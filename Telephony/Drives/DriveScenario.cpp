@@ -1,0 +1,83 @@
+#include "Telephony/Drives/DriveScenario.h"
+
+#include <algorithm>
+#include <utility>
+
+namespace velmora {
+
+Time DriveScenario::beginning() {
+    using namespace std::chrono;
+    return sys_days{year{2026} / January / 5} + hours{8};
+}
+
+ScenarioEvent DriveScenario::next() {
+    while (_events.empty())
+        advance();
+    ScenarioEvent event = std::move(_events.front());
+    _events.pop_front();
+    return event;
+}
+
+void DriveScenario::advance() {
+    drive(step_s);
+    followTimeline();
+    react();
+
+    const double end = _now + step_s;
+    DriveScript due;
+    while (!_script.empty() && _script.begin()->first < end)
+        due.insert(due.end(), _script.extract(_script.begin()));
+    addReports(due);
+    for (const auto& [at, step] : due) {
+        countUntil(at);
+        send(at, step());
+    }
+    _now = end;
+    addDamage();
+}
+
+void DriveScenario::followTimeline() {
+    if (_now < _phaseEnd || !_script.empty())
+        return;
+    const Phase& phase = _phases[_phase];
+    _phase = (_phase + 1) % _phases.size();
+    _phaseEnd = _now + phase.duration_s;
+    if (phase.begin)
+        (this->*phase.begin)();
+}
+
+void DriveScenario::countUntil(double) {}
+
+bool DriveScenario::timeToReselect(bool better, double after_s) {
+    if (better && _now - _betterSince < after_s)
+        return false;
+    _betterSince = _now;
+    return better;
+}
+
+void DriveScenario::addDamage() {
+    if (_now < _nextDamage)
+        return;
+    _nextDamage = _now + 5 + 10 * _random.unit();
+    const std::size_t number = _damage++;
+    const DamageMaterial material = damageMaterial(number);
+    const auto offset = offsetOf(_now);
+    if (const auto message =
+            damagedMessage(everyDamage[number % everyDamage.size()], material, beginning() + offset))
+        _events.push_back({offset, *message});
+}
+
+void DriveScenario::send(double at, const std::optional<RecordBuilder>& record) {
+    if (!record)
+        return;
+    const auto offset = offsetOf(at);
+    _events.push_back({offset, record->message(beginning() + offset)});
+}
+
+std::chrono::nanoseconds DriveScenario::offsetOf(double at) {
+    // A moment that two steps reckon in different ways may come out a nanosecond apart.
+    _lastOffset = std::max(_lastOffset, std::chrono::nanoseconds(std::llround(at * 1e9)));
+    return _lastOffset;
+}
+
+} // namespace velmora

@@ -1,0 +1,19 @@
+#pragma once
+
+#include "Telephony/Drives/RecordBuilder.h"
+
+#include <functional>
+#include <map>
+#include <optional>
+
+namespace velmora {
+
+/// Changes the phone of a scenario and gives the record that tells of it, or nothing where there is none to
+/// send.
+using DriveStep = std::function<std::optional<RecordBuilder>()>;
+
+/// Steps by their time, in seconds from the scenario's start; those of one time in the order in which they
+/// were put there.
+using DriveScript = std::multimap<double, DriveStep>;
+
+} // namespace velmora

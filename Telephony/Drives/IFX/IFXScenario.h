@@ -1,0 +1,46 @@
+#pragma once
+
+#include "Telephony/Drives/IFX/IFXDisplay.h"
+#include "Telephony/Drives/Scenario.h"
+
+#include <cstddef>
+
+namespace velmora {
+
+/// A drive through the GSM cells of RadioNetwork, in the IFX technology: once a second the baseband sends its
+/// whole display as one property list, in the binary and the XML form by turns. What an engineer sees in a
+/// round of two and a half minutes:
+///
+/// - Searching: neighbours alone. Then a serving cell in limited service, then registration.
+/// - Idle: identities, serving cell, six neighbours whose levels rise and fall; reselection to a neighbour
+///   that is 6 dB better, and the area with it.
+/// - A call: its dedicated channel with the receive quality and the seconds that it lasts; handovers.
+/// - A packet session of one context, then one of two, with the coding scheme.
+/// - Again from the start, at another place of the ring.
+///
+/// Dictionaries of one entry are among what it sends, some in every message, some only where there is no more
+/// to say, and a chain of them; they show as their single value. No message is ever odd, unlike those of the
+/// other scenarios: this technology's decoder ends the application where it cannot read one, or where one
+/// holds anything but dictionaries, arrays and strings.
+///
+/// All comes of the seed: the same seed gives the same bytes. Main thread only.
+class IFXScenario final : public Scenario {
+public:
+    explicit IFXScenario(std::uint64_t seed);
+
+    [[nodiscard]] std::string_view technology() const override;
+    [[nodiscard]] ScenarioEvent next() override;
+
+private:
+    void followTimeline();
+    void camp();
+
+    RadioNetwork _network;
+    ScenarioRandom _random;
+    IFXPhone _phone;
+    int _seconds = 0; ///< messages so far
+    std::size_t _phase = 0;
+    int _phaseEnd = 0;
+};
+
+} // namespace velmora

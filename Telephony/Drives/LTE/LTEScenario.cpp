@@ -1,0 +1,200 @@
+#include "Telephony/Drives/LTE/LTEScenario.h"
+
+#include "Platform/TelephonyService.h"
+#include "Telephony/Drives/ServingMeasurement.h"
+
+#include <algorithm>
+
+namespace velmora {
+
+namespace {
+
+constexpr double reselectionMargin_dB = 4;
+constexpr double reselectionTime_s = 2;
+
+/// How much of a new measurement goes into the average.
+constexpr double averaging = 0.3;
+
+} // namespace
+
+/// The round.
+const DriveScenario::Phase LTEScenario::phases[] = {
+    {5, &LTEScenario::powerOn},
+    {5, &LTEScenario::registerWithNetwork},
+    {18, nullptr}, // idle
+    {25, &LTEScenario::startSession},
+    {3, &LTEScenario::endSession},
+    {10, &LTEScenario::changeCarrier},
+    {5, &LTEScenario::connectBriefly},
+    {10, &LTEScenario::changeCarrier},
+    {5, &LTEScenario::connectBriefly},
+    {10, &LTEScenario::changeCarrier},
+    {5, &LTEScenario::connectBriefly},
+    {10, &LTEScenario::changeCarrier},
+    {5, &LTEScenario::connectBriefly},
+    {10, &LTEScenario::changeCarrier},
+    {5, &LTEScenario::connectBriefly},
+    {10, &LTEScenario::changeCarrier}, // to the first again
+    {5, &LTEScenario::powerOff},
+};
+
+LTEScenario::LTEScenario(std::uint64_t seed)
+    : DriveScenario(seed ^ 0x5EED, phases), _network(seed), _context{_phone, _network, random()} {}
+
+std::string_view LTEScenario::technology() const {
+    return kVoxLogChannelTechnology_Ostrel_LTE;
+}
+
+std::optional<RecordBuilder> LTEScenario::camp() {
+    if (_network.cells(_phone.carrier).empty())
+        return std::nullopt;
+    _phone.radio = LTEPhone::Radio::Camped;
+    _phone.serving = _network.cells(_phone.carrier).front();
+    _phone.average = *_phone.serving;
+    _phone.cyclesBelow = 0;
+    return lteReports::servingCell(_context);
+}
+
+void LTEScenario::sayConnected(double delay, bool connected) {
+    say(delay, [this, connected] {
+        _phone.connected = connected && _phone.serving;
+        return lteReports::antennas(_context);
+    });
+}
+
+void LTEScenario::sayContexts(double delay, int count) {
+    say(delay, [this, count] {
+        _phone.contexts = count;
+        return lteReports::contexts(_context);
+    });
+}
+
+void LTEScenario::powerOn() {
+    const CellArea lastArea = _phone.registeredArea; // the SIM remembers it
+    _phone = LTEPhone{};
+    _phone.registeredArea = lastArea;
+    _phone.radio = LTEPhone::Radio::Searching;
+    sayContexts(0.2, 0);
+    say(0.5, [this] { return lteReports::sim(_context); });
+    say(4, [this] { return camp(); });
+    say(4.1, [this] { return lteReports::antennas(_context); });
+}
+
+void LTEScenario::registerWithNetwork() {
+    sayConnected(0.2, true);
+    say(2.0, [this] {
+        if (_phone.serving)
+            _phone.registeredArea = _phone.serving->cell.area;
+        return lteReports::sim(_context);
+    });
+    sayContexts(2.2, 1); // LTE knows no registration without one
+    sayConnected(4, false);
+}
+
+void LTEScenario::startSession() {
+    sayConnected(0.2, true);
+    sayContexts(1.0, random().chance(0.5) ? 2 : 1);
+}
+
+void LTEScenario::endSession() {
+    sayContexts(0.1, 1);
+    sayConnected(1, false);
+}
+
+void LTEScenario::changeCarrier() {
+    // The modem weighs the candidates before it goes.
+    say(1, [this] { return lteReports::candidates(_context); });
+    say(2, [this] {
+        _phone.carrier = (_phone.carrier + 1) % lteCarriers.size();
+        return camp();
+    });
+}
+
+void LTEScenario::connectBriefly() {
+    sayConnected(0.2, true);
+    sayConnected(4, false);
+}
+
+void LTEScenario::updateArea() {
+    const bool registered = _phone.contexts > 0;
+    if (!registered || !_phone.serving || !script().empty() ||
+        _phone.serving->cell.area == _phone.registeredArea)
+        return;
+    if (!_phone.connected) {
+        sayConnected(0.1, true);
+        sayConnected(2, false);
+    }
+    say(1, [this] {
+        _phone.registeredArea = _phone.serving->cell.area;
+        return lteReports::sim(_context);
+    });
+}
+
+void LTEScenario::powerOff() {
+    sayConnected(0.1, true);
+    sayContexts(1, 0);
+    say(1.5, [this]() -> std::optional<RecordBuilder> {
+        _phone.connected = false;
+        _phone.radio = LTEPhone::Radio::Off;
+        _phone.serving.reset();
+        return std::nullopt;
+    });
+}
+
+void LTEScenario::drive(double seconds) {
+    _network.drive(seconds);
+    if (!_phone.serving)
+        return;
+    _phone.serving = measuredAnew(*_phone.serving, _network.cells(_phone.carrier));
+    _phone.average.rsrp_dBm += averaging * (_phone.serving->rsrp_dBm - _phone.average.rsrp_dBm);
+    _phone.average.rsrq_dB += averaging * (_phone.serving->rsrq_dB - _phone.average.rsrq_dB);
+    _phone.cyclesBelow =
+        records::selectionLevel_dB(*_phone.serving) < 0 ? std::min(_phone.cyclesBelow + 1, 63) : 0;
+}
+
+void LTEScenario::react() {
+    const auto& cells = _network.cells(_phone.carrier);
+    const bool better = _phone.serving && !cells.empty() &&
+                        cells.front().rsrp_dBm >= _phone.serving->rsrp_dBm + reselectionMargin_dB;
+    if (timeToReselect(better, reselectionTime_s))
+        say(0, [this] { return camp(); });
+    updateArea();
+}
+
+void LTEScenario::addReports(DriveScript& due) {
+    schedule(reportsOf(_phone), _context, 0.137, due);
+}
+
+DamageMaterial LTEScenario::damageMaterial(std::size_t number) {
+    // Which records are spoilt changes from round to round of the kinds of damage.
+    const std::size_t round = number / everyDamage.size();
+    const LTEMeasurement serving = _phone.serving.value_or(LTEMeasurement{});
+    RecordBuilder tooShort = records::lteServingCell(serving.cell);
+    switch (round % 5) {
+    case 1: tooShort = records::lteIdleMeasurement({serving, serving}); break;
+    case 2: tooShort = records::lteIntraFrequency(serving, 0, {}, {}); break;
+    case 3: tooShort = records::lteNeighbours(lteCarriers[0], {{serving, serving}}).cutTo(21); break;
+    case 4: tooShort = records::reselectionCandidates(serving.cell, {}); break;
+    default: break;
+    }
+    tooShort.cutTo(tooShort.size() - 1);
+
+    std::optional<RecordBuilder> overrun;
+    switch (round % 3) {
+    case 0: // two detected cells more than there are
+        overrun = records::lteIntraFrequency(serving, 0, {serving}, {serving}).u8(28, 3);
+        break;
+    case 1: // two neighbours, of which the second is cut
+        overrun =
+            records::lteNeighbours(lteCarriers[_phone.carrier], {{serving, serving}, {serving, serving}});
+        overrun->cutTo(60);
+        break;
+    default: // three candidates, of which one is there
+        overrun = records::reselectionCandidates(serving.cell, {{records::RATType::UTRAN, 2, 10588, 300}});
+        overrun->u16(19, 3).cutTo(29);
+        break;
+    }
+    return {records::lteServingCell(serving.cell), tooShort, overrun, static_cast<std::int64_t>(number)};
+}
+
+} // namespace velmora

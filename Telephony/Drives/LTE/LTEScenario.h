@@ -1,0 +1,67 @@
+#pragma once
+
+#include "Telephony/Drives/DriveScenario.h"
+#include "Telephony/Drives/LTE/LTEReports.h"
+
+namespace velmora {
+
+/// A drive through an LTE network of test networks 001/01 and 001/02, in the Ostrel LTE technology
+/// (LTENetwork). What an engineer sees in a round of less than three minutes:
+///
+/// - Power-on: cells of band 3 found; the serving cell with its frequencies, bandwidth and identity; then
+///   registration in connected mode and a first packet-data context.
+/// - Idle: level, quality and selection parameters of the serving cell; up to six neighbours whose levels
+///   rise and fall, every fourth time those of another carrier; reselection when a neighbour has been 4 dB
+///   better for 2 s. Where the tracking area changes (7101 and 7102 in 001/01, 8201 in 001/02) the phone
+///   connects for its update, and the SIM's location follows.
+/// - A packet session: connected mode with the serving cell's filtered level, up to six measured neighbours
+///   and three detected cells, and handovers; now and then a second context.
+/// - A walk over all carriers, 20 MHz down to 1.4, at each of them idle and briefly connected. On the two
+///   narrowest the search for other frequencies has no threshold ("Not Present"); in 001/02 the power has no
+///   limit. Then power-off, and again from the start, at another place of the ring.
+///
+/// In idle mode reselection candidates come one by one: of LTE, UTRAN, GERAN, CDMA 1x, CDMA HRPD and of an
+/// unknown technology. Every seventh time three come at once; then each but the last shows as its own channel
+/// and cell the priority and type of the one after it, since that is where the record has them.
+///
+/// From six to eight messages come a second. The extra stream tells of the SIM, the cells around and the
+/// contexts, as binary and XML property lists in turn. Every ten seconds or so a message is odd (see Damage):
+/// the records of serving cell, idle and connected measurement, neighbours and candidates come too short by
+/// turns, and each of the three counted ones with a count too high.
+/// Main thread only.
+class LTEScenario final : public DriveScenario {
+public:
+    explicit LTEScenario(std::uint64_t seed);
+    [[nodiscard]] std::string_view technology() const override;
+
+private:
+    static const Phase phases[];
+
+    /// What the phone goes through; each puts its steps on the script, from now on.
+    void powerOn();
+    void registerWithNetwork();
+    void startSession();
+    void endSession();
+    /// Reselects to the best cell of the next carrier.
+    void changeCarrier();
+    void connectBriefly();
+    /// Tells the network of the tracking area, where it knows another.
+    void updateArea();
+    void powerOff();
+
+    void drive(double seconds) override;
+    void react() override;
+    void addReports(DriveScript& due) override;
+    [[nodiscard]] DamageMaterial damageMaterial(std::size_t number) override;
+
+    /// Camps on the best cell of the phone's carrier, where there is one, and tells of it.
+    std::optional<RecordBuilder> camp();
+    void sayConnected(double delay, bool connected);
+    void sayContexts(double delay, int count);
+
+    LTENetwork _network;
+    LTEPhone _phone;
+    LTEReportContext _context;
+};
+
+} // namespace velmora

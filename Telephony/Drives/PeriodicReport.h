@@ -1,0 +1,17 @@
+#pragma once
+
+#include "Telephony/Drives/RecordBuilder.h"
+
+#include <optional>
+
+namespace velmora {
+
+/// A record that the modem sends over and over; `Context` is what the technology's reports are made from.
+template <class Context>
+struct PeriodicReport {
+    double period_s;
+    /// Nothing where the phone's state has nothing to report.
+    std::optional<RecordBuilder> (*make)(Context&);
+};
+
+} // namespace velmora

@@ -1,0 +1,249 @@
+#include "Telephony/Service/LogServer.h"
+
+#include "LogMessages/RecordHeader.h"
+#include "Platform/SystemLog.h"
+#include "Platform/TelephonyService.h"
+#include "PropertyLists/PropertyList.h"
+
+#include <algorithm>
+#include <utility>
+
+namespace velmora {
+namespace {
+
+/// A dictionary of one entry, as replies are.
+Value replyOf(std::string_view key, Value value) {
+    return Value(std::make_shared<Dictionary>(Dictionary{{std::string(key), std::move(value)}}));
+}
+
+std::optional<Data> serialized(const Value& reply) {
+    const auto text = writeXMLPropertyList(reply);
+    if (!text) {
+        logFormat(LogPriority::Error, "cannot write a reply: %s", text.reason().c_str());
+        return std::nullopt;
+    }
+    return Data(std::vector<std::uint8_t>(text->begin(), text->end()));
+}
+
+Value refusal(LogServer::Refusal reason) {
+    return replyOf(vox::errorKey, static_cast<std::int32_t>(reason));
+}
+
+} // namespace
+
+LogServer::LogServer(MessagePorts& ports, MainQueue& queue, LogSource& source)
+    : _ports(ports), _queue(queue), _source(source) {}
+
+LogServer::~LogServer() {
+    stop();
+}
+
+Result<Done> LogServer::listen(std::function<void()> whenLost) {
+    const std::string name(vox::serverPortName);
+    const auto answer = [this](LocalPort&, std::int32_t messageId,
+                               const Data& payload) -> std::optional<Data> {
+        if (messageId != 0)
+            return std::nullopt;
+        return serialized(createChannel(payload));
+    };
+    const MessagePorts::Created created = _ports.createLocal(name, answer);
+    if (!created.port)
+        return Failure{"cannot make the port " + name};
+    if (created.alreadyExisted)
+        return Failure{"the port " + name + " is taken, wanted to be the only telephony service"};
+    _serverPort = created.port;
+    _serverPort->setInvalidationCallback([lost = std::move(whenLost)](LocalPort& port) {
+        logFormat(LogPriority::Error, "the port %s was closed", port.name().c_str());
+        lost();
+    });
+    _serverPort->attachToMainQueue();
+    _source.whenTechnologyChanges([this] { technologyChanged(); });
+    return Done{};
+}
+
+void LogServer::stop() {
+    if (const auto port = std::exchange(_serverPort, nullptr)) {
+        port->setInvalidationCallback(nullptr);
+        port->invalidate();
+        _source.whenTechnologyChanges(nullptr);
+    }
+    for (const ChannelRef& channel : _channels)
+        if (channel->isOpen())
+            channel->close();
+    sweep();
+}
+
+Value LogServer::createChannel(const Data& request) {
+    const auto parsed = readPropertyList(request.bytes());
+    if (!parsed) {
+        logFormat(LogPriority::Error, "cannot read a request for a log channel: %s", parsed.reason().c_str());
+        return refusal(Refusal::Malformed);
+    }
+    const Dictionary* dictionary = parsed->asDictionary();
+    const std::string* name = dictionary ? (*dictionary)[vox::createLogChannelKey].asString() : nullptr;
+    if (!name || name->empty()) {
+        logLine(LogPriority::Error, "a request names no port, wanted {\"CreateLogChannel\": NAME}");
+        return refusal(Refusal::Malformed);
+    }
+    sweep();
+    if (_channels.size() >= maximumChannels) {
+        logFormat(LogPriority::Error, "%s wants a log channel, but %zu are open already", name->c_str(),
+                  _channels.size());
+        return refusal(Refusal::TooManyChannels);
+    }
+    std::shared_ptr<RemotePort> application = _ports.createRemote(*name);
+    if (!application) {
+        logFormat(LogPriority::Error, "%s wants a log channel, but there is no such port", name->c_str());
+        return refusal(Refusal::NoSuchPort);
+    }
+    // A name has one owner: an open channel to that name is one to an owner who has gone, or an earlier one
+    // of the same owner's, who would now get everything twice.
+    for (const ChannelRef& channel : _channels)
+        if (channel->applicationName() == *name)
+            close(*channel, *name + " has gone");
+    std::shared_ptr<LocalPort> commands = createChannelPort();
+    if (!commands) {
+        logFormat(LogPriority::Error, "%s wants a log channel, but no port can be made for it",
+                  name->c_str());
+        return refusal(Refusal::NoChannelPort);
+    }
+    const auto channel = std::make_shared<LogChannel>(_queue, commands, application);
+    _channels.push_back(channel);
+    const std::weak_ptr<LogChannel> weak = channel;
+    application->setInvalidationCallback([this, weak](RemotePort&) {
+        if (const auto gone = weak.lock())
+            close(*gone, gone->applicationName() + " has gone");
+    });
+    commands->setInvalidationCallback([this, weak](LocalPort&) {
+        if (const auto gone = weak.lock())
+            close(*gone, gone->applicationName() + " has gone");
+    });
+    commands->attachToMainQueue();
+    logFormat(LogPriority::Notice, "%s: opened for %s", channel->name().c_str(), name->c_str());
+    return replyOf(vox::portKey, channel->name());
+}
+
+std::shared_ptr<LocalPort> LogServer::createChannelPort() {
+    const auto answer = [this](LocalPort& port, std::int32_t messageId, const Data& payload) {
+        return messageId == 0 ? command(port.name(), payload) : std::nullopt;
+    };
+    // Numbers are not used again; one that is taken all the same belongs to somebody else.
+    for (int attempt = 0; attempt < 100; ++attempt) {
+        const std::string name =
+            std::string(vox::serverPortName) + ".channel." + std::to_string(++_channelsMade);
+        const MessagePorts::Created created = _ports.createLocal(name, answer);
+        if (!created.port || !created.alreadyExisted)
+            return created.port;
+    }
+    return nullptr;
+}
+
+void LogServer::technologyChanged() {
+    const std::string why =
+        "the technology is " + std::string(shortTechnologyName(_source.technology())) + " now";
+    for (const ChannelRef& channel : _channels)
+        close(*channel, why);
+}
+
+void LogServer::close(LogChannel& channel, const std::string& why) {
+    if (!channel.isOpen())
+        return;
+    logFormat(LogPriority::Notice, "%s: closed, %s", channel.name().c_str(), why.c_str());
+    channel.close();
+    // Not at once: messages may be on their way to the channels just now.
+    _queue.async([this, weak = std::weak_ptr<bool>(_alive)] {
+        if (!weak.expired())
+            sweep();
+    });
+}
+
+void LogServer::sweep() {
+    std::erase_if(_channels, [](const ChannelRef& channel) { return !channel->isOpen(); });
+    const bool streaming = std::any_of(_channels.begin(), _channels.end(),
+                                       [](const ChannelRef& channel) { return channel->isStreaming(); });
+    if (!_sourceRuns || streaming)
+        return;
+    _sourceRuns = false;
+    _source.stop();
+    _latestExtra.clear();
+}
+
+std::optional<Data> LogServer::command(const std::string& channelName, const Data& payload) {
+    const auto found = std::find_if(_channels.begin(), _channels.end(), [&](const ChannelRef& channel) {
+        return channel->isOpen() && channel->name() == channelName;
+    });
+    if (found == _channels.end())
+        return std::nullopt;
+    const ChannelRef channel = *found;
+    const auto parsed = readPropertyList(payload.bytes());
+    if (!parsed) {
+        logFormat(LogPriority::Error, "%s: cannot read a command: %s", channelName.c_str(),
+                  parsed.reason().c_str());
+        return std::nullopt;
+    }
+    const Dictionary* dictionary = parsed->asDictionary();
+    if (dictionary && dictionary->contains(vox::getTechnologyKey)) {
+        if (_source.technology().empty())
+            return serialized(Value(makeDictionary())); // the client asks again later
+        return serialized(replyOf(vox::getTechnologyKey, _source.technology()));
+    }
+    if (dictionary && dictionary->contains(vox::setStateKey)) {
+        startStreaming(*channel, *dictionary);
+        return std::nullopt;
+    }
+    logFormat(LogPriority::Error, "%s: a command has neither GetTechnology nor SetState",
+              channelName.c_str());
+    return std::nullopt;
+}
+
+void LogServer::startStreaming(LogChannel& channel, const Dictionary& command) {
+    const Value& state = command[vox::setStateKey];
+    if (!state.asString() || *state.asString() != vox::streamingState) {
+        const std::string found =
+            state.asString() ? '"' + *state.asString() + '"' : "of kind " + std::string(nameOf(state.kind()));
+        logFormat(LogPriority::Error, "%s: SetState is %s, wanted \"Streaming\"", channel.name().c_str(),
+                  found.c_str());
+        return;
+    }
+    auto filter = LogFilter::fromStartCommand(command);
+    if (!filter) {
+        logFormat(LogPriority::Error, "%s: %s", channel.name().c_str(), filter.reason().c_str());
+        return;
+    }
+    // Whoever has gone must not keep a run of the source alive that a new client would then join half-way.
+    sweep();
+    channel.stream(*std::move(filter));
+    logFormat(LogPriority::Notice, "%s: streaming to %s", channel.name().c_str(),
+              channel.applicationName().c_str());
+    if (!_sourceRuns) {
+        _sourceRuns = true;
+        _source.start(*this);
+        return;
+    }
+    for (const auto& [code, message] : _latestExtra)
+        channel.send(message);
+}
+
+void LogServer::take(const Data& message) {
+    remember(message);
+    // A channel may close on the way; none is added or removed.
+    for (const ChannelRef& channel : _channels)
+        channel->send(message);
+}
+
+void LogServer::remember(const Data& message) {
+    const auto header = recordHeader(message.bytes());
+    if (!header || header->type != RecordHeader::extraType)
+        return;
+    if (_latestExtra.size() < maximumRemembered || _latestExtra.contains(header->code))
+        _latestExtra.insert_or_assign(header->code, message);
+}
+
+bool LogServer::hasRoom() const {
+    bool room = true;
+    for (const ChannelRef& channel : _channels)
+        room = channel->hasRoom() && room;
+    return room;
+}
+
+} // namespace velmora

@@ -1,0 +1,67 @@
+#include "Telephony/Sources/SourceFactory.h"
+
+#include "Platform/TelephonyService.h"
+#include "Recording/OpenMessages.h"
+#include "Telephony/Drives/ScenarioRegistry.h"
+#include "Telephony/ModemManager/ModemManagerSource.h"
+#include "Telephony/Sources/ReplaySource.h"
+#include "Telephony/Sources/ScenarioSource.h"
+
+#include <utility>
+
+namespace velmora {
+namespace {
+
+using Made = Result<std::unique_ptr<LogSource>>;
+
+Made make(const ScenarioChoice& choice, MainQueue& queue, const Clock& clock) {
+    const ScenarioKind* kind = scenarioKindNamed(choice.name);
+    if (!kind)
+        return Failure{"scenario is \"" + choice.name + "\", wanted one of: " + scenarioNames()};
+    auto makeScenario = [make = kind->make, seed = choice.seed] { return make(seed); };
+    return std::unique_ptr<LogSource>(
+        std::make_unique<ScenarioSource>(queue, clock, std::move(makeScenario), choice.speed));
+}
+
+Made make(const ReplayChoice& choice, MainQueue& queue, const Clock& clock) {
+    auto open = [file = choice.file] { return openMessages(file); };
+    auto source = ReplaySource::create(queue, clock, choice.file, std::move(open),
+                                       {choice.speed, choice.loop, choice.technology});
+    if (!source)
+        return Failure{source.reason()};
+    return std::unique_ptr<LogSource>(*std::move(source));
+}
+
+Made make(const ModemManagerChoice& choice, MainQueue& queue, const Clock& clock) {
+    return std::unique_ptr<LogSource>(
+        std::make_unique<ModemManagerSource>(queue, clock, ModemFollower::Options{choice.modem, {}}));
+}
+
+} // namespace
+
+Result<std::unique_ptr<LogSource>> makeSource(const SourceChoice& choice, MainQueue& queue,
+                                              const Clock& clock) {
+    return std::visit([&](const auto& chosen) { return make(chosen, queue, clock); }, choice);
+}
+
+std::string sourceHelp(std::string_view program) {
+    const std::string call = "  " + std::string(program) + " --source ";
+    std::string help = "Sources:\n"
+                       "  scenario:NAME[,seed=N][,speed=X]  a synthetic drive, the same for the same seed;"
+                       " speed 1 is its own pace\n";
+    for (const ScenarioKind& kind : scenarioKinds())
+        help += "    " + std::string(kind.name) + ": " + std::string(kind.description) + "\n";
+    help += "  replay:FILE[,speed=X][,loop][,technology=NAME]\n"
+            "    a recording, snapshot or DLF log at its own pace; speed max is as fast as clients take it;"
+            " technology, where the file does not tell its own, is one of ";
+    help += technologyNames() + "\n";
+    help += "  modemmanager[,modem=INDEX]\n"
+            "    the modem that ModemManager looks after, live; without INDEX the first that has a SIM\n\n";
+    help += "Examples:\n";
+    help += call + "scenario:gsm,seed=7,speed=2\n";
+    help += call + "replay:drive.pcapng,speed=max,loop\n";
+    help += call + "modemmanager";
+    return help;
+}
+
+} // namespace velmora

@@ -1,0 +1,22 @@
+#pragma once
+
+#include "Platform/Clock.h"
+#include "Platform/MainQueue.h"
+#include "Platform/Result.h"
+#include "Telephony/Sources/LogSource.h"
+#include "Telephony/Sources/SourceString.h"
+
+#include <memory>
+#include <string>
+#include <string_view>
+
+namespace velmora {
+
+/// The source that was chosen. Fails for a file that cannot be played. Queue and clock must outlive it.
+Result<std::unique_ptr<LogSource>> makeSource(const SourceChoice& choice, MainQueue& queue,
+                                              const Clock& clock);
+
+/// What the program's help says of the sources, with an example of each.
+[[nodiscard]] std::string sourceHelp(std::string_view program);
+
+} // namespace velmora

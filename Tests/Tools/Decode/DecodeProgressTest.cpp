@@ -1,0 +1,62 @@
+#include "Tools/Decode/DecodeProgress.h"
+
+#include "Tests/Support/FakeClock.h"
+#include "Tests/Support/TemporaryDirectory.h"
+
+#include <gmock/gmock.h>
+
+#include <filesystem>
+#include <fstream>
+#include <vector>
+
+namespace velmora {
+namespace {
+
+using testing::ElementsAre;
+using namespace std::chrono_literals;
+
+constexpr std::uint64_t mebibyte = std::uint64_t{1} << 20;
+
+TEST(DecodeProgressTest, ShowsPercentRateAndTimeLeft) {
+    FakeClock clock;
+    std::vector<std::string> lines;
+    DecodeProgress progress(1000 * mebibyte, clock, [&](std::string_view line) { lines.emplace_back(line); });
+    clock.advance(500ms);
+    progress.at(mebibyte - 1); // too near for a look at the clock
+    progress.at(50 * mebibyte);
+    clock.advance(100ms);
+    progress.at(60 * mebibyte); // too soon
+    clock.advance(1400ms);
+    progress.at(205 * mebibyte + 100);
+    clock.advance(8s);
+    progress.at(505 * mebibyte);
+    clock.advance(100s);
+    progress.at(515 * mebibyte);
+    progress.at(2000 * mebibyte); // no time has gone by
+    clock.advance(1s);
+    progress.at(3000 * mebibyte); // a file that has grown
+    EXPECT_THAT(lines, ElementsAre("0 %", "5 %, 100 MiB/s, 10 s left", "20 %, 102 MiB/s, 8 s left",
+                                   "50 %, 50 MiB/s, 10 s left", "51 %, 4 MiB/s, 1 min 44 s left",
+                                   "100 %, 9 MiB/s, 0 s left"));
+}
+
+TEST(DecodeProgressTest, AFileThatWasEmptyHasNoShares) {
+    FakeClock clock;
+    std::vector<std::string> lines;
+    DecodeProgress progress(0, clock, [&](std::string_view line) { lines.emplace_back(line); });
+    clock.advance(1s);
+    progress.at(2 * mebibyte);
+    EXPECT_THAT(lines, ElementsAre("0 %"));
+}
+
+TEST(DecodeProgressTest, OnlyFilesHaveASize) {
+    const TemporaryDirectory directory;
+    std::ofstream(directory / "five") << "bytes";
+    EXPECT_EQ(inputSize((directory / "five").string()), 5U);
+    EXPECT_EQ(inputSize((directory / "gone").string()), std::nullopt);
+    EXPECT_EQ(inputSize("/dev/null"), std::nullopt);
+    EXPECT_EQ(inputSize("/"), std::nullopt);
+}
+
+} // namespace
+} // namespace velmora

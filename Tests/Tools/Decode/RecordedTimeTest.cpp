@@ -1,0 +1,73 @@
+#include "Tools/Decode/RecordedTime.h"
+
+#include <gtest/gtest.h>
+
+namespace velmora {
+namespace {
+
+using namespace std::chrono_literals;
+
+constexpr Time start = Time(1'000s);
+
+TEST(RecordedTicksTest, WithoutMessagesThereIsNoTick) {
+    EXPECT_EQ(RecordedTicks().last(), std::nullopt);
+}
+
+TEST(RecordedTicksTest, TicksLieEveryTwoSecondsFromTheFirstMessageOn) {
+    RecordedTicks ticks;
+    EXPECT_EQ(ticks.before(start), std::nullopt);
+    EXPECT_EQ(ticks.before(start + 500ms), std::nullopt);
+    EXPECT_EQ(ticks.before(start + 2s - 1ns), std::nullopt);
+    EXPECT_EQ(ticks.before(start + 2'100ms), start + 2s);
+    EXPECT_EQ(ticks.before(start + 3s), std::nullopt);
+    EXPECT_EQ(ticks.before(start + 4'500ms), start + 4s);
+    EXPECT_EQ(ticks.last(), start + 6s);
+}
+
+TEST(RecordedTicksTest, TickComesBeforeAMessageStampedAtIt) {
+    RecordedTicks ticks;
+    EXPECT_EQ(ticks.before(start), std::nullopt);
+    EXPECT_EQ(ticks.before(start + 2s), start + 2s);
+    EXPECT_EQ(ticks.before(start + 2s), std::nullopt);
+    EXPECT_EQ(ticks.before(start + 4s), start + 4s);
+    EXPECT_EQ(ticks.last(), start + 6s);
+}
+
+TEST(RecordedTicksTest, TicksWithoutMessagesDoNotRefresh) {
+    RecordedTicks ticks;
+    EXPECT_EQ(ticks.before(start), std::nullopt);
+    // Those at 4 s to 100 s have had none.
+    EXPECT_EQ(ticks.before(start + 101s), start + 2s);
+    EXPECT_EQ(ticks.before(start + 101'500ms), std::nullopt);
+    EXPECT_EQ(ticks.before(start + 102s), start + 102s);
+}
+
+TEST(RecordedTicksTest, TimeThatGoesBackMakesNoTickDue) {
+    RecordedTicks ticks;
+    EXPECT_EQ(ticks.before(start), std::nullopt);
+    EXPECT_EQ(ticks.before(start - 3600s), std::nullopt);
+    EXPECT_EQ(ticks.before(Time::min()), std::nullopt);
+    EXPECT_EQ(ticks.before(start + 1s), std::nullopt);
+    EXPECT_EQ(ticks.before(start + 3s), start + 2s);
+}
+
+TEST(RecordedTicksTest, TimeThatJumpsFromTheBeginningToTheEndIsNoWork) {
+    RecordedTicks ticks;
+    EXPECT_EQ(ticks.before(Time::min()), std::nullopt);
+    EXPECT_EQ(ticks.before(Time::max()), Time::min() + 2s);
+    // No later moment is left for a tick.
+    EXPECT_EQ(ticks.before(Time::max()), std::nullopt);
+    EXPECT_EQ(ticks.before(Time::min()), std::nullopt);
+    EXPECT_EQ(ticks.last(), Time::max());
+}
+
+TEST(RecordedClockTest, ShowsWhatItWasSetToInUTC) {
+    RecordedClock clock;
+    clock.setNow(start);
+    EXPECT_EQ(clock.now(), start);
+    EXPECT_EQ(clock.zoneAt(start).offset, 0s);
+    EXPECT_FALSE(clock.zoneAt(start).daylightSaving);
+}
+
+} // namespace
+} // namespace velmora

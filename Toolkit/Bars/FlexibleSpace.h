@@ -1,0 +1,10 @@
+#pragma once
+
+#include "Toolkit/Bars/ToolbarItem.h"
+
+namespace velmora {
+
+/// Takes what room the other items of the toolbar leave.
+class FlexibleSpace : public ToolbarItem {};
+
+} // namespace velmora

@@ -1,0 +1,77 @@
+#pragma once
+
+#include "Toolkit/Navigation/NavigationControllerDelegate.h"
+#include "Toolkit/Navigation/ViewController.h"
+
+#include <memory>
+#include <vector>
+
+namespace velmora {
+
+class NavigationView;
+
+/// A stack of screens ("panes"), of which the top one shows, between a header (title, back button) above and,
+/// unless hidden, the top pane's toolbar below. The stack holds its panes. Operations change the stack at
+/// once; what is animated is only the picture, and only where the user wants motion. An operation cuts the
+/// animation of the one before it short.
+///
+/// Escape, Alt-Left and the back key of a device uncover the pane below the top.
+class NavigationController : public ViewController {
+public:
+    /// Throws std::invalid_argument for no root.
+    explicit NavigationController(std::shared_ptr<ViewController> rootViewController);
+    ~NavigationController() override;
+
+    /// Not owned; null for none.
+    void setDelegate(NavigationControllerDelegate* delegate);
+
+    /// Throws std::invalid_argument for null or a controller that is on a stack already.
+    void pushViewController(std::shared_ptr<ViewController> viewController, bool animated);
+    /// Takes the top pane off and returns it; null when it is the root, which stays.
+    std::shared_ptr<ViewController> popViewController(bool animated);
+    /// Takes off all panes above the given one and returns them, bottom first; none when that one is on top
+    /// or not on the stack. Only the uncovered pane is shown, none of those between.
+    std::vector<std::shared_ptr<ViewController>> popToViewController(const ViewController& viewController,
+                                                                     bool animated);
+
+    [[nodiscard]] std::shared_ptr<ViewController> topViewController() const;
+    /// Bottom first.
+    [[nodiscard]] const std::vector<std::shared_ptr<ViewController>>& viewControllers() const {
+        return _panes;
+    }
+
+    /// True at first.
+    [[nodiscard]] bool isToolbarHidden() const { return _isToolbarHidden; }
+    void setToolbarHidden(bool isHidden, bool animated = false);
+
+    void viewWillAppear(bool animated) override;
+    void viewDidAppear(bool animated) override;
+    void viewWillDisappear(bool animated) override;
+    void viewDidDisappear(bool animated) override;
+    /// The top pane's.
+    bool becomeFirstResponder() override;
+    /// Pops.
+    void cancelOperation() override;
+    /// Presses the toolbar's Save button.
+    void saveOperation() override;
+
+protected:
+    [[nodiscard]] std::unique_ptr<View> loadView() override;
+
+private:
+    friend class ViewController;
+
+    [[nodiscard]] NavigationView& stackView();
+    /// Has the top pane take the place of the old one.
+    void showTop(const std::shared_ptr<ViewController>& old, bool isPush, bool animated);
+    void announceTop(bool animated);
+    void fillBars(bool animated);
+    void viewControllerChanged(const ViewController& viewController);
+
+    std::vector<std::shared_ptr<ViewController>> _panes;
+    NavigationControllerDelegate* _delegate = nullptr;
+    bool _isToolbarHidden = true;
+    bool _isOnScreen = false;
+};
+
+} // namespace velmora

@@ -1,0 +1,9 @@
+#include "Toolkit/Navigation/NavigationControllerDelegate.h"
+
+namespace velmora {
+
+void NavigationControllerDelegate::willShowViewController(NavigationController& /*navigationController*/,
+                                                          ViewController& /*viewController*/,
+                                                          bool /*animated*/) {}
+
+} // namespace velmora

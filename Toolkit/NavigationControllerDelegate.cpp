@@ -1,9 +1,0 @@
-#include "Toolkit/NavigationControllerDelegate.h"
-
-namespace velmora {
-
-void NavigationControllerDelegate::willShowViewController(NavigationController& /*navigationController*/,
-                                                          ViewController& /*viewController*/,
-                                                          bool /*animated*/) {}
-
-} // namespace velmora

@@ -1,9 +1,0 @@
-#include "Toolkit/TableViewDataSource.h"
-
-namespace velmora {
-
-std::size_t TableViewDataSource::numberOfSections(TableView& /*tableView*/) {
-    return 1;
-}
-
-} // namespace velmora

@@ -1,7 +1,0 @@
-#include "Toolkit/TableViewDelegate.h"
-
-namespace velmora {
-
-void TableViewDelegate::didSelectRowAtIndexPath(TableView& /*tableView*/, const IndexPath& /*indexPath*/) {}
-
-} // namespace velmora

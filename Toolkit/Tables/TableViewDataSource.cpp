@@ -1,0 +1,9 @@
+#include "Toolkit/Tables/TableViewDataSource.h"
+
+namespace velmora {
+
+std::size_t TableViewDataSource::numberOfSections(TableView& /*tableView*/) {
+    return 1;
+}
+
+} // namespace velmora

@@ -1,0 +1,26 @@
+#pragma once
+
+#include "Toolkit/Tables/IndexPath.h"
+
+#include <cstddef>
+#include <memory>
+
+namespace velmora {
+
+class TableCell;
+class TableView;
+
+/// Says what a table shows. Outlives the table's use of it.
+class TableViewDataSource {
+public:
+    virtual ~TableViewDataSource() = default;
+    /// 1 unless overridden.
+    [[nodiscard]] virtual std::size_t numberOfSections(TableView& tableView);
+    [[nodiscard]] virtual std::size_t numberOfRowsInSection(TableView& tableView, std::size_t section) = 0;
+    /// The cell for a row that comes onto the screen: one from `dequeueReusableCell`, or a fresh one. Null
+    /// shows an empty row.
+    [[nodiscard]] virtual std::shared_ptr<TableCell> cellForRowAtIndexPath(TableView& tableView,
+                                                                           const IndexPath& indexPath) = 0;
+};
+
+} // namespace velmora

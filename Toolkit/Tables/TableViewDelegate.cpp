@@ -1,0 +1,7 @@
+#include "Toolkit/Tables/TableViewDelegate.h"
+
+namespace velmora {
+
+void TableViewDelegate::didSelectRowAtIndexPath(TableView& /*tableView*/, const IndexPath& /*indexPath*/) {}
+
+} // namespace velmora

@@ -1,0 +1,18 @@
+#pragma once
+
+#include "Toolkit/Tables/IndexPath.h"
+
+namespace velmora {
+
+class TableView;
+
+/// Hears what the user does with a table. Outlives the table's use of it.
+class TableViewDelegate {
+public:
+    virtual ~TableViewDelegate() = default;
+    /// The user tapped or clicked the row, or pressed Enter on it; it is the selected one by now. Nothing
+    /// unless overridden.
+    virtual void didSelectRowAtIndexPath(TableView& tableView, const IndexPath& indexPath);
+};
+
+} // namespace velmora

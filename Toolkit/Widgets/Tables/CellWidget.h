@@ -1,0 +1,51 @@
+#pragma once
+
+#include "Toolkit/Tables/TableCell.h"
+
+#include <QWidget>
+
+#include <cstddef>
+#include <optional>
+
+namespace velmora {
+
+/// Draws a table cell's ground, separator, focus frame and accessory.
+class CellWidget : public QWidget {
+public:
+    CellWidget();
+
+    /// Null once the cell is gone.
+    TableCell* cell = nullptr;
+    /// The row that the cell stands for, counted through all sections; none while it waits to be used again.
+    std::optional<std::size_t> row;
+    /// The row that it last stood for.
+    std::optional<std::size_t> lastRow;
+
+    void setSelected(bool isSelected);
+    void setPressed(bool isPressed);
+    void setFocusFrame(bool hasFocusFrame);
+    [[nodiscard]] bool isSelected() const { return _isSelected; }
+    [[nodiscard]] bool isHighlighted() const { return _isSelected || _isPressed; }
+    [[nodiscard]] bool hasFocusFrame() const { return _hasFocusFrame; }
+    /// Tells a screen reader when the row is called otherwise than when this was last asked.
+    void announceName();
+
+    /// How much an accessory takes of the cell's width.
+    [[nodiscard]] static double accessoryWidth(TableCellAccessory accessory);
+    /// Whether the widget lies in a highlighted cell.
+    [[nodiscard]] static bool isOnHighlight(const QWidget& widget);
+
+protected:
+    void paintEvent(QPaintEvent* event) override;
+
+private:
+    void set(bool& flag, bool value);
+    void paintAccessory(QPainter& painter) const;
+
+    bool _isSelected = false;
+    bool _isPressed = false;
+    bool _hasFocusFrame = false;
+    std::string _announcedName;
+};
+
+} // namespace velmora

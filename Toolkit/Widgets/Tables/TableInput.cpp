@@ -1,0 +1,172 @@
+#include "Toolkit/Widgets/Tables/TableInput.h"
+
+#include "Toolkit/Widgets/Finger.h"
+#include "Toolkit/Widgets/ScrollWidget.h"
+#include "Toolkit/Widgets/Tables/CellWidget.h"
+#include "Toolkit/Widgets/Tables/TableWidget.h"
+
+#include <QKeyEvent>
+#include <QMouseEvent>
+#include <QScrollBar>
+#include <QScrollEvent>
+#include <QScrollPrepareEvent>
+#include <QTouchEvent>
+
+#include <algorithm>
+#include <cmath>
+
+namespace velmora {
+
+namespace {
+
+constexpr double sidewaysStep = 60;
+
+} // namespace
+
+TableInput::TableInput(TableWidget& table) : _table(table) {}
+
+TableInput::~TableInput() = default;
+
+bool TableInput::handle(QEvent* event) {
+    switch (event->type()) {
+    case QEvent::TouchBegin:
+    case QEvent::TouchUpdate:
+    case QEvent::TouchEnd:
+    case QEvent::TouchCancel:
+        touch(*static_cast<QTouchEvent*>(event));
+        event->accept();
+        return true;
+    case QEvent::MouseButtonPress: {
+        const auto* const mouse = static_cast<QMouseEvent*>(event);
+        return mouse->button() == Qt::LeftButton && press(mouse->position().toPoint());
+    }
+    case QEvent::MouseButtonDblClick: return true; // out of habit; one click is all that it takes
+    case QEvent::MouseButtonRelease: {
+        const auto* const mouse = static_cast<QMouseEvent*>(event);
+        return mouse->button() == Qt::LeftButton && release(mouse->position().toPoint());
+    }
+    case QEvent::MouseMove:
+        if (_pressed)
+            _table.setPressedRow(_table.rowAt(static_cast<QMouseEvent*>(event)->position().toPoint()) ==
+                                         _pressed
+                                     ? _pressed
+                                     : std::nullopt);
+        return _pressed.has_value();
+    case QEvent::ScrollPrepare: {
+        auto* const prepare = static_cast<QScrollPrepareEvent*>(event);
+        _underFinger = ScrollWidget::at(*_table.viewport(), prepare->startPos().toPoint());
+        prepare->setViewportSize(_table.viewport()->size());
+        prepare->setContentPosRange({0, 0, _underFinger ? _underFinger->maximumOffset() : 0,
+                                     static_cast<double>(_table.verticalScrollBar()->maximum())});
+        prepare->setContentPos({_underFinger ? _underFinger->offset() : 0,
+                                static_cast<double>(_table.verticalScrollBar()->value())});
+        prepare->accept();
+        return true;
+    }
+    case QEvent::Scroll: {
+        // The finger moves: it does not mean the row that it came down on.
+        cancelPress();
+        const QPointF place = static_cast<QScrollEvent*>(event)->contentPos();
+        if (_underFinger)
+            _underFinger->setOffset(place.x());
+        _table.verticalScrollBar()->setValue(static_cast<int>(std::round(place.y())));
+        return true;
+    }
+    default: return false;
+    }
+}
+
+void TableInput::touch(const QTouchEvent& event) {
+    const bool isScroll = followFinger(*_table.viewport(), event);
+    if (event.type() == QEvent::TouchCancel || event.points().isEmpty()) {
+        cancelPress();
+        return;
+    }
+    const QPoint place = _table.viewport()->mapFromGlobal(event.points().first().globalPosition()).toPoint();
+    if (event.type() == QEvent::TouchBegin && !isScroll) {
+        _table.setFocus(Qt::MouseFocusReason);
+        (void)press(place);
+    } else if (event.type() == QEvent::TouchEnd) {
+        (void)release(place);
+    }
+}
+
+bool TableInput::press(const QPoint& place) {
+    _pressed = _table.rowAt(place);
+    _table.setShowsFocus(false);
+    _table.setPressedRow(_pressed);
+    return _pressed.has_value();
+}
+
+bool TableInput::release(const QPoint& place) {
+    if (!_pressed)
+        return false;
+    const std::optional<std::size_t> row = _table.rowAt(place);
+    const bool isTap = row && row == _pressed;
+    cancelPress();
+    if (isTap)
+        _table.choose(*row);
+    return true;
+}
+
+void TableInput::cancelPress() {
+    if (!_pressed)
+        return;
+    _pressed.reset();
+    _table.setPressedRow(std::nullopt);
+}
+
+void TableInput::handleKey(QKeyEvent* event) {
+    event->ignore();
+    if (event->modifiers() & (Qt::ControlModifier | Qt::AltModifier | Qt::MetaModifier))
+        return;
+    switch (event->key()) {
+    case Qt::Key_Left: event->setAccepted(scrollSideways(-1)); break;
+    case Qt::Key_Right: event->setAccepted(scrollSideways(1)); break;
+    case Qt::Key_Return:
+    case Qt::Key_Enter:
+    case Qt::Key_Space:
+    case Qt::Key_Select:
+        event->accept();
+        if (_table.focusRow() && !event->isAutoRepeat())
+            _table.choose(*_table.focusRow());
+        break;
+    default: event->setAccepted(moveFocus(event->key())); break;
+    }
+}
+
+bool TableInput::moveFocus(int key) {
+    const auto total = static_cast<long long>(_table.rows().total());
+    const auto page = static_cast<long long>(_table.rowsPerPage());
+    const auto now = static_cast<long long>(_table.focusRow().value_or(0));
+    long long next = 0;
+    switch (key) {
+    case Qt::Key_Up: next = now - 1; break;
+    case Qt::Key_Down: next = _table.focusRow() ? now + 1 : 0; break;
+    case Qt::Key_PageUp: next = now - page; break;
+    case Qt::Key_PageDown: next = now + page; break;
+    case Qt::Key_Home: next = 0; break;
+    case Qt::Key_End: next = total - 1; break;
+    default: return false;
+    }
+    if (total == 0)
+        return true;
+    _table.setShowsFocus(true);
+    _table.setFocusRow(static_cast<std::size_t>(std::clamp(next, 0LL, total - 1)));
+    return true;
+}
+
+bool TableInput::scrollSideways(int direction) {
+    CellWidget* const cell = _table.cellWidget(_table.focusRow());
+    if (!cell)
+        return false;
+    for (QWidget* const child : cell->findChildren<QWidget*>())
+        if (auto* const scroller = dynamic_cast<ScrollWidget*>(child);
+            scroller && scroller->maximumOffset() > 0) {
+            scroller->setOffset(scroller->offset() + direction * sidewaysStep);
+            return true;
+        }
+    return false;
+}
+
+} // namespace velmora

@@ -1,0 +1,277 @@
+#include "Toolkit/Widgets/Tables/TableWidget.h"
+
+#include "Toolkit/Tables/TableCell.h"
+#include "Toolkit/Tables/TableView.h"
+#include "Toolkit/Widgets/Accessibility.h"
+#include "Toolkit/Widgets/Conversions.h"
+#include "Toolkit/Widgets/ScrollWidget.h"
+#include "Toolkit/Widgets/Tables/CellWidget.h"
+
+#include <QFocusEvent>
+#include <QFontMetricsF>
+#include <QPointer>
+#include <QScrollBar>
+
+#include <algorithm>
+#include <cmath>
+#include <utility>
+
+namespace velmora {
+
+TableWidget::TableWidget() : _input(*this) {
+    setObjectName("velmora.table");
+    setFrameShape(QFrame::NoFrame);
+    setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
+    setFocusPolicy(Qt::StrongFocus);
+    viewport()->setBackgroundRole(QPalette::Base);
+    viewport()->setAutoFillBackground(true);
+    viewport()->setForegroundRole(QPalette::Text);
+    viewport()->setAttribute(Qt::WA_AcceptTouchEvents);
+}
+
+TableWidget::~TableWidget() = default;
+
+void TableWidget::releaseCells() {
+    for (const auto& [row, cell] : _cells)
+        cell->widget()->setParent(nullptr);
+    _cells.clear();
+    _queue.clear();
+}
+
+void TableWidget::reload() {
+    if (!view || _isLayingOut)
+        return;
+    _isLoaded = true;
+    std::vector<std::size_t> counts;
+    if (dataSource) {
+        counts.resize(dataSource->numberOfSections(*view));
+        for (std::size_t section = 0; section < counts.size(); ++section)
+            counts[section] = dataSource->numberOfRowsInSection(*view, section);
+    }
+    const IndexPath selected = _rows.path(_selected);
+    const IndexPath focus = _rows.path(_focus);
+    _rows = TableRows(std::move(counts));
+
+    // The cells stay where they are until they have been asked for again, and nothing is drawn before the
+    // event loop turns: a row that shows what it showed is not even redrawn.
+    while (!_cells.empty())
+        recycle(_cells.rbegin()->first);
+    _selected = _rows.row(selected);
+    _pressed = _pressed && *_pressed < _rows.total() ? _pressed : std::nullopt;
+    if (!focus.isNull())
+        _focus = _rows.row(focus);
+    if (!_focus && (!focus.isNull() || hasFocus()) && _rows.total() > 0)
+        _focus = focus.isNull() ? 0 : _rows.total() - 1;
+    updateScrollRange();
+    layoutRows();
+    for (const auto& [row, cell] : _cells)
+        static_cast<CellWidget*>(cell->widget())->announceName();
+    if (_rows.path(_focus) != focus)
+        announceFocus();
+}
+
+void TableWidget::loadOnce() {
+    if (!_isLoaded)
+        reload();
+}
+
+std::shared_ptr<TableCell> TableWidget::dequeue(std::string_view identifier) {
+    std::shared_ptr<TableCell> cell = _queue.take(identifier);
+    if (!cell)
+        return nullptr;
+    cell->setFrame(
+        {0, cell->frame().y, static_cast<double>(viewport()->width()), static_cast<double>(rowHeight())});
+    cell->prepareForReuse();
+    return cell;
+}
+
+CellWidget* TableWidget::cellWidget(std::optional<std::size_t> row) const {
+    const auto found = row ? _cells.find(*row) : _cells.end();
+    return found == _cells.end() ? nullptr : static_cast<CellWidget*>(found->second->widget());
+}
+
+int TableWidget::rowHeight() const {
+    const double text = QFontMetricsF(toQt(Font::systemFontOfSize(15))).height();
+    return static_cast<int>(std::max(44.0, std::ceil(text) + 20));
+}
+
+QRect TableWidget::rowRect(std::size_t row) const {
+    const auto top = static_cast<long long>(row) * rowHeight() - verticalScrollBar()->value();
+    return {0, static_cast<int>(top), viewport()->width(), rowHeight()};
+}
+
+std::optional<std::size_t> TableWidget::rowAt(const QPoint& place) const {
+    const int y = place.y() + verticalScrollBar()->value();
+    if (!viewport()->rect().contains(place) || y < 0)
+        return std::nullopt;
+    const auto row = static_cast<std::size_t>(y / rowHeight());
+    return row < _rows.total() ? std::optional(row) : std::nullopt;
+}
+
+std::size_t TableWidget::rowsPerPage() const {
+    return static_cast<std::size_t>(std::max(viewport()->height() / rowHeight(), 1));
+}
+
+void TableWidget::setSelectedRow(std::optional<std::size_t> row) {
+    _selected = row && *row < _rows.total() ? row : std::nullopt;
+    updateMarks();
+}
+
+void TableWidget::setPressedRow(std::optional<std::size_t> row) {
+    _pressed = row;
+    updateMarks();
+}
+
+void TableWidget::setFocusRow(std::optional<std::size_t> row) {
+    _focus = row && *row < _rows.total() ? row : std::nullopt;
+    if (_focus)
+        scrollToRow(*_focus);
+    updateMarks();
+    announceFocus();
+}
+
+void TableWidget::setShowsFocus(bool shows) {
+    _showsFocus = shows;
+    updateMarks();
+}
+
+void TableWidget::scrollToRow(std::size_t row) {
+    const QRect rect = rowRect(row);
+    QScrollBar* const bar = verticalScrollBar();
+    if (rect.top() < 0)
+        bar->setValue(bar->value() + rect.top());
+    else if (rect.bottom() >= viewport()->height())
+        bar->setValue(bar->value() + rect.bottom() + 1 - viewport()->height());
+}
+
+void TableWidget::choose(std::size_t row) {
+    _focus = row;
+    setSelectedRow(row);
+    if (delegate && view)
+        delegate->didSelectRowAtIndexPath(*view, _rows.path(row));
+}
+
+void TableWidget::layoutRows() {
+    if (!view || _isLayingOut)
+        return;
+    _isLayingOut = true;
+    const int height = rowHeight();
+    const int offset = verticalScrollBar()->value();
+    const auto first = std::min(static_cast<std::size_t>(std::max(offset, 0) / height), _rows.total());
+    const int bottom = offset + viewport()->height();
+    const auto end =
+        std::min(static_cast<std::size_t>(std::max((bottom + height - 1) / height, 0)), _rows.total());
+
+    std::vector<std::size_t> leaving;
+    for (const auto& [row, cell] : _cells)
+        if (row < first || row >= end)
+            leaving.push_back(row);
+    for (const std::size_t row : leaving)
+        recycle(row);
+    for (std::size_t row = first; row < end; ++row) {
+        std::shared_ptr<TableCell>& cell = _cells[row];
+        if (!cell)
+            cell = makeCell(row);
+        cell->setFrame(fromQt(rowRect(row)));
+        cell->setHidden(false);
+    }
+    _queue.hideAll();
+    updateMarks();
+    _isLayingOut = false;
+}
+
+void TableWidget::recycle(std::size_t row) {
+    const auto node = _cells.extract(row);
+    static_cast<CellWidget*>(node.mapped()->widget())->row.reset();
+    _queue.add(node.mapped());
+}
+
+std::shared_ptr<TableCell> TableWidget::makeCell(std::size_t row) {
+    std::shared_ptr<TableCell> cell = dataSource->cellForRowAtIndexPath(*view, _rows.path(row));
+    if (!cell)
+        cell = std::make_shared<TableCell>(TableCellStyle::plain, std::string());
+    auto* const widget = static_cast<CellWidget*>(cell->widget());
+    if (widget->parentWidget() != viewport())
+        widget->setParent(viewport());
+    widget->row = row;
+    if (std::exchange(widget->lastRow, row) != row)
+        for (QObject* const child : widget->findChildren<QWidget*>())
+            if (auto* const scroller = dynamic_cast<ScrollWidget*>(child))
+                scroller->setOffset(0);
+    cell->setFrame(fromQt(rowRect(row)));
+    cell->layoutSubviews(); // its texts may be others than when it was last laid out
+    return cell;
+}
+
+void TableWidget::updateScrollRange() {
+    const auto content = static_cast<long long>(_rows.total()) * rowHeight();
+    const long long most = std::clamp(content - viewport()->height(), 0LL, 1LL << 30);
+    verticalScrollBar()->setPageStep(viewport()->height());
+    verticalScrollBar()->setSingleStep(rowHeight());
+    const bool wasLayingOut = std::exchange(_isLayingOut, true); // one layout follows, whatever the bar does
+    verticalScrollBar()->setRange(0, static_cast<int>(most));
+    _isLayingOut = wasLayingOut;
+}
+
+void TableWidget::updateMarks() {
+    for (const auto& [row, cell] : _cells) {
+        if (!cell) // being made
+            continue;
+        auto* const widget = static_cast<CellWidget*>(cell->widget());
+        widget->setSelected(_selected == row);
+        widget->setPressed(_pressed == row);
+        widget->setFocusFrame(_focus == row && _showsFocus && hasFocus());
+    }
+}
+
+void TableWidget::announceFocus() {
+    CellWidget* const widget = cellWidget(_focus);
+    if (widget && hasFocus())
+        announce(*widget, QAccessible::Focus);
+}
+
+void TableWidget::resizeEvent(QResizeEvent* event) {
+    QAbstractScrollArea::resizeEvent(event);
+    updateScrollRange();
+    layoutRows();
+}
+
+void TableWidget::showEvent(QShowEvent* event) {
+    QAbstractScrollArea::showEvent(event);
+    loadOnce();
+}
+
+void TableWidget::scrollContentsBy(int /*dx*/, int /*dy*/) {
+    layoutRows();
+}
+
+bool TableWidget::viewportEvent(QEvent* event) {
+    return _input.handle(event) || QAbstractScrollArea::viewportEvent(event);
+}
+
+void TableWidget::keyPressEvent(QKeyEvent* event) {
+    _input.handleKey(event);
+}
+
+void TableWidget::focusInEvent(QFocusEvent* event) {
+    if (!_focus && _rows.total() > 0)
+        _focus = rowAt({0, rowHeight() - 1}).value_or(0);
+    if (event->reason() == Qt::TabFocusReason || event->reason() == Qt::BacktabFocusReason)
+        _showsFocus = true;
+    updateMarks();
+    announceFocus();
+}
+
+void TableWidget::focusOutEvent(QFocusEvent* /*event*/) {
+    updateMarks();
+}
+
+void TableWidget::changeEvent(QEvent* event) {
+    QAbstractScrollArea::changeEvent(event);
+    if (event->type() == QEvent::FontChange || event->type() == QEvent::StyleChange) {
+        updateScrollRange();
+        layoutRows();
+    }
+}
+
+} // namespace velmora

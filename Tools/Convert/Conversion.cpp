@@ -1,0 +1,157 @@
+#include "Tools/Convert/Conversion.h"
+
+#include "Model/Snapshot.h"
+#include "Platform/Linux/Errno.h"
+#include "Platform/Linux/Files/Files.h"
+#include "Platform/TelephonyService.h"
+#include "PropertyLists/PropertyList.h"
+#include "Recording/DLF/DLFWriter.h"
+#include "Recording/Pcapng/RecordingWriter.h"
+#include "Tools/Decode/Decoding.h"
+#include "Tools/Decode/RecordedTime.h"
+#include "Tools/Report.h"
+#include "Tools/Technologies.h"
+
+#include <cerrno>
+#include <utility>
+
+#include <fcntl.h>
+
+namespace velmora {
+
+namespace {
+
+/// A file's messages, the first of which has been read: a file may name its technology no earlier than there.
+struct Messages {
+    MessageReader& reader;
+    std::optional<LoggedMessage> next;
+    std::string technology; ///< the short name
+
+    void advance() { next = reader.next(); }
+};
+
+Result<Messages> begin(MessageReader& reader, const Conversion& conversion) {
+    std::optional<LoggedMessage> first = reader.next();
+    const std::string& named = conversion.technology.empty() ? reader.technology() : conversion.technology;
+    const Result<std::string> technology = technologyNamed(named);
+    if (!technology)
+        return Failure{conversion.title + ": " + technology.reason() +
+                       (named.empty() ? "; --technology supplies it" : "")};
+    return Messages{reader, std::move(first), std::string(shortTechnologyName(*technology))};
+}
+
+/// A second descriptor of the file, for a writer that closes what it is given.
+Result<int> ownDescriptor(int descriptor, const std::string& name) {
+    const int copy = ::fcntl(descriptor, F_DUPFD_CLOEXEC, 0);
+    if (copy < 0)
+        return Failure{"cannot write " + name + ": " + errnoText(errno)};
+    return copy;
+}
+
+Result<bool> toRecording(MessageReader& reader, const Conversion& conversion, int descriptor) {
+    Result<Messages> messages = begin(reader, conversion);
+    if (!messages)
+        return Failure{messages.reason()};
+    const Result<int> own = ownDescriptor(descriptor, conversion.name);
+    if (!own)
+        return Failure{own.reason()};
+    const auto writer = RecordingWriter::adopt(*own, conversion.name, messages->technology);
+    if (!writer)
+        return Failure{writer.reason()};
+    for (; messages->next; messages->advance())
+        if (const auto appended = (*writer)->append(messages->next->time, messages->next->message.bytes());
+            !appended)
+            return Failure{appended.reason()};
+    if (const auto closed = (*writer)->close(); !closed)
+        return Failure{closed.reason()};
+    return true;
+}
+
+Result<bool> toDLFLog(MessageReader& reader, const Conversion& conversion, int descriptor) {
+    Result<Messages> messages = begin(reader, conversion);
+    if (!messages)
+        return Failure{messages.reason()};
+    if (technologyConstant(messages->technology) == kVoxLogChannelTechnology_IFX)
+        return Failure{conversion.title + ": technology " + messages->technology +
+                       " has no DLF log: its messages are no records"};
+    const Result<int> own = ownDescriptor(descriptor, conversion.name);
+    if (!own)
+        return Failure{own.reason()};
+    // The log's own time is that of its first record, so that the same messages make the same log.
+    RecordedClock clock;
+    if (messages->next)
+        clock.setNow(messages->next->time);
+    const auto writer = DLFWriter::adopt(*own, conversion.name, clock);
+    if (!writer)
+        return Failure{writer.reason()};
+    for (; messages->next; messages->advance()) {
+        const auto appended = (*writer)->append(messages->next->message.bytes());
+        if ((*writer)->hasFailed())
+            return Failure{appended.reason()};
+        if (!appended && (*writer)->refused() <= MessageReader::maximumLosses)
+            report(placeInFile(conversion.title, messages->next->number, messages->next->offset) +
+                   ": left out: " + appended.reason());
+    }
+    if (const std::uint64_t refused = (*writer)->refused(); refused > MessageReader::maximumLosses)
+        report(conversion.title + ": left out " + std::to_string(refused) + " messages in all");
+    if (const auto closed = (*writer)->close(); !closed)
+        return Failure{closed.reason()};
+    return (*writer)->refused() == 0;
+}
+
+/// Waits for what a snapshot saves.
+class SaveContents final : public DecodingObserver {
+public:
+    /// Of the last refresh; absent where there was none.
+    std::optional<Time> tick;
+    ArrayRef contents;
+
+    [[nodiscard]] bool wantsHistory() const override { return true; }
+    void refreshed(Time refreshTick, const Decoded&) override { tick = refreshTick; }
+    void ended(const LogGenerator& decoder, const Dictionary& state) override {
+        contents = decoder.getSaveContentsFromState(state);
+    }
+};
+
+Result<bool> toSnapshot(MessageReader& reader, const Conversion& conversion, int descriptor,
+                        WorkContext& context) {
+    SaveContents saved;
+    DecodingRequest request;
+    request.technology = conversion.technology;
+    if (const Result<Decoded> decoded = decodeMessages(reader, request, context, saved); !decoded)
+        return Failure{conversion.title + ": " + decoded.reason()};
+    // Without a refresh there is no time but now.
+    const Time timeStamp = saved.tick ? *saved.tick : MachineClock().now();
+    const Result<std::string> list =
+        writeXMLPropertyList(makeSnapshot(timeStamp, saved.contents, conversion.description));
+    if (!list)
+        return Failure{conversion.title + ": cannot be made a snapshot: " + list.reason()};
+    const Bytes content(reinterpret_cast<const std::uint8_t*>(list->data()), list->size());
+    if (const Result<Done> written = writeAll(descriptor, content); !written)
+        return Failure{conversion.name + ": " + written.reason()};
+    return true;
+}
+
+} // namespace
+
+std::optional<FileForm> formFromName(std::string_view name) {
+    if (name.ends_with(".pcapng"))
+        return FileForm::Recording;
+    if (name.ends_with(".velmora"))
+        return FileForm::Snapshot;
+    if (name.ends_with(".dlf"))
+        return FileForm::DLFLog;
+    return std::nullopt;
+}
+
+Result<bool> convertMessages(MessageReader& reader, const Conversion& conversion, int descriptor,
+                             WorkContext& context) {
+    switch (conversion.form) {
+    case FileForm::Recording: return toRecording(reader, conversion, descriptor);
+    case FileForm::DLFLog: return toDLFLog(reader, conversion, descriptor);
+    case FileForm::Snapshot: break;
+    }
+    return toSnapshot(reader, conversion, descriptor, context);
+}
+
+} // namespace velmora

@@ -1,0 +1,126 @@
+#include "Tools/Convert/ConvertCommand.h"
+
+#include "Platform/Linux/Files/FileDraft.h"
+#include "Recording/OpenMessages.h"
+#include "Tools/Convert/Conversion.h"
+#include "Tools/Decode/Decoding.h"
+#include "Tools/ExitStatus.h"
+#include "Tools/Report.h"
+
+#include <algorithm>
+#include <climits>
+#include <csignal>
+#include <memory>
+#include <string_view>
+
+#include <sys/stat.h>
+#include <unistd.h>
+
+namespace velmora {
+
+namespace {
+
+constexpr mode_t newFileMode = 0666;
+
+/// The name of what a signal that ends the program leaves behind. A signal handler gets at nothing else.
+char nameToRemove[PATH_MAX];
+
+void removeAndEnd(int number) {
+    ::unlink(nameToRemove);
+    ::signal(number, SIG_DFL);
+    ::raise(number);
+}
+
+/// While it lives, a signal from the user removes the file before it ends the program.
+class RemovedWhenInterrupted {
+public:
+    explicit RemovedWhenInterrupted(std::string_view name) {
+        if (name.size() >= sizeof nameToRemove)
+            return;
+        *std::copy(name.begin(), name.end(), nameToRemove) = '\0';
+        handle(removeAndEnd);
+    }
+    ~RemovedWhenInterrupted() { handle(SIG_DFL); }
+    RemovedWhenInterrupted(const RemovedWhenInterrupted&) = delete;
+    RemovedWhenInterrupted& operator=(const RemovedWhenInterrupted&) = delete;
+
+private:
+    static void handle(void (*handler)(int)) {
+        for (const int number : {SIGHUP, SIGINT, SIGTERM})
+            // Whoever started the program with a signal ignored wants it to stay so.
+            if (::signal(number, handler) == SIG_IGN)
+                ::signal(number, SIG_IGN);
+    }
+};
+
+bool isSameFile(const struct stat& a, const struct stat& b) {
+    return a.st_dev == b.st_dev && a.st_ino == b.st_ino;
+}
+
+/// Why the output may not be written; empty where it may.
+std::string whyRefused(const ConvertOptions& options) {
+    struct stat out = {};
+    if (::stat(options.out.c_str(), &out) != 0)
+        return {};
+    struct stat in = {};
+    const bool hasInput =
+        (options.file == "-" ? ::fstat(STDIN_FILENO, &in) : ::stat(options.file.c_str(), &in)) == 0;
+    if (hasInput && isSameFile(in, out))
+        return options.out + " is the input, wanted another file";
+    if (!S_ISREG(out.st_mode))
+        return options.out + " is no regular file";
+    return options.force ? std::string() : alreadyThere(options.out);
+}
+
+/// Whether all of the input is in the output now.
+bool convert(const ConvertOptions& options, MessageReader& reader, const std::string& title) {
+    // Before the draft, so that no moment is left in which memory that cannot be had would leave one behind.
+    FileDraft* made = nullptr;
+    WorkContext context(title, [&made] {
+        if (made)
+            made->discard();
+    });
+    Result<FileDraft> draft = FileDraft::create(options.out, newFileMode);
+    if (!draft) {
+        report(options.out + ": " + draft.reason());
+        return false;
+    }
+    made = &*draft;
+    const RemovedWhenInterrupted removed(draft->path());
+    Conversion conversion;
+    conversion.form = *formFromName(options.out);
+    conversion.title = title;
+    conversion.name = options.out;
+    conversion.technology = options.technology;
+    conversion.description = options.description;
+    const Result<bool> converted = convertMessages(reader, conversion, draft->descriptor(), context);
+    if (!converted) {
+        report(converted.reason());
+        return false;
+    }
+    using WhereThereIsOne = FileDraft::WhereThereIsOne;
+    const auto published = draft->publish(options.force ? WhereThereIsOne::Replace : WhereThereIsOne::Refuse);
+    if (!published)
+        report(options.out + ": " + published.reason());
+    return published && *converted;
+}
+
+} // namespace
+
+int runConvert(const ConvertOptions& options) {
+    if (const std::string reason = whyRefused(options); !reason.empty()) {
+        report(reason);
+        return ExitStatus::BadInput;
+    }
+    const std::string title = fileTitle(options.file);
+    const Result<std::unique_ptr<MessageReader>> reader = openMessages(options.file);
+    if (!reader) {
+        report(title + ": " + reader.reason());
+        return ExitStatus::BadInput;
+    }
+    const bool converted = convert(options, **reader, title);
+    const bool whole = reportLosses(**reader, title);
+    return converted && whole ? ExitStatus::Done : ExitStatus::BadInput;
+}
+
+} // namespace velmora

@@ -1,0 +1,49 @@
+#include "Tools/Decode/CSVRows.h"
+
+#include "Tools/Text/CSVText.h"
+
+namespace velmora {
+
+CSVRows::CSVRows(Output& output, bool isLive, const DecodeOptions& options, const std::string& file)
+    : LineWriter(output, isLive), _options(options) {
+    if (file.empty())
+        return;
+    TextBuffer cell;
+    cell.append(',');
+    appendCsvText(cell, file);
+    _fileCell = cell.view();
+}
+
+void CSVRows::messageDecoded(const LoggedMessage& message, const Dictionary& state) {
+    if (_options.every == DecodeOptions::Every::Message)
+        writeRow(message.time, state["Display"]);
+}
+
+void CSVRows::refreshed(Time tick, const Decoded& decoded) {
+    if (_options.every == DecodeOptions::Every::Refresh)
+        writeRow(tick, decoded.display);
+    LineWriter::refreshed(tick, decoded);
+}
+
+std::string CSVRows::header(const DecodeOptions& options) {
+    TextBuffer row;
+    row.append(options.files.size() > 1 ? "time,file" : "time");
+    for (const std::string& path : options.selection.paths()) {
+        row.append(',');
+        appendCsvText(row, path);
+    }
+    row.append(csvRowEnd);
+    return std::string(row.view());
+}
+
+void CSVRows::writeRow(Time moment, const Value& display) {
+    appendTime(moment);
+    line().append(_fileCell);
+    for (const std::string& path : _options.selection.paths()) {
+        line().append(',');
+        appendCsvCell(line(), NodeSelection::find(display, path));
+    }
+    endLine(csvRowEnd);
+}
+
+} // namespace velmora

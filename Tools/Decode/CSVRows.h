@@ -1,0 +1,27 @@
+#pragma once
+
+#include "Tools/Text/LineWriter.h"
+
+#include <string>
+
+namespace velmora {
+
+/// Comma-separated values (RFC 4180), a row for each refresh or message: its time, the file where `file` is
+/// not empty, and a cell for each selected path.
+class CSVRows final : public LineWriter {
+public:
+    CSVRows(Output& output, bool isLive, const DecodeOptions& options, const std::string& file);
+    void messageDecoded(const LoggedMessage& message, const Dictionary& state) override;
+    void refreshed(Time tick, const Decoded& decoded) override;
+
+    /// The first row: "time", "file" where there are several, the paths as they were given.
+    [[nodiscard]] static std::string header(const DecodeOptions& options);
+
+private:
+    void writeRow(Time moment, const Value& display);
+
+    const DecodeOptions& _options;
+    std::string _fileCell;
+};
+
+} // namespace velmora

@@ -1,0 +1,115 @@
+#include "Tools/Decode/DecodeCommand.h"
+
+#include "Recording/OpenMessages.h"
+#include "Tools/Decode/CSVRows.h"
+#include "Tools/Decode/DecodeJobs.h"
+#include "Tools/Decode/DecodeProgress.h"
+#include "Tools/Decode/DecodeWriter.h"
+#include "Tools/ExitStatus.h"
+#include "Tools/LogSubstitute.h"
+#include "Tools/Output.h"
+#include "Tools/Report.h"
+#include "Tools/Text/PrintableText.h"
+
+#include <algorithm>
+#include <memory>
+#include <optional>
+
+#include <unistd.h>
+
+namespace velmora {
+
+namespace {
+
+bool writesAsItGoes(const DecodeOptions& options) {
+    return options.format == DecodeOptions::Format::JsonLines || options.format == DecodeOptions::Format::Csv;
+}
+
+/// The progress of one file on standard error, where there is anybody to look at it and time to do so.
+class ShownProgress {
+public:
+    ShownProgress(const std::string& path, const DecodeOptions& options) {
+        if (::isatty(STDERR_FILENO) == 0)
+            return;
+        // On one terminal it would stand between the lines.
+        if (writesAsItGoes(options) && ::isatty(STDOUT_FILENO) != 0)
+            return;
+        const std::optional<std::uint64_t> size = inputSize(path);
+        if (!size || *size <= DecodeProgress::smallestInput)
+            return;
+        _line.emplace();
+        _progress.emplace(*size, _clock, [this](std::string_view text) { _line->show(text); });
+    }
+
+    [[nodiscard]] DecodeProgress* get() { return _progress ? &*_progress : nullptr; }
+    /// Takes the line away, before anything else is written there.
+    void clear() {
+        if (_line)
+            _line->clear();
+    }
+
+private:
+    MachineClock _clock;
+    std::optional<ProgressLine> _line;
+    std::optional<DecodeProgress> _progress;
+};
+
+/// Decodes one file and prints it. Whether its input was good.
+bool decodeFile(std::size_t index, const DecodeOptions& options, bool showsProgress, Output& output) {
+    const std::string& path = options.files[index];
+    const std::string title = fileTitle(path);
+    const Result<std::unique_ptr<MessageReader>> reader = openMessages(path);
+    if (!reader) {
+        report(title + ": " + reader.reason());
+        return false;
+    }
+    std::string heading;
+    if (options.files.size() > 1)
+        heading = (index > 0 ? "\n== " : "== ") + printable(title) + " ==\n";
+    const bool isLive = !inputSize(path);
+    const std::unique_ptr<DecodeWriter> writer = DecodeWriter::make(options, path, isLive, heading, output);
+    std::optional<ShownProgress> progress;
+    if (showsProgress)
+        progress.emplace(path, options);
+    const auto clearProgress = [&progress] {
+        if (progress)
+            progress->clear();
+    };
+    WorkContext context(title, [&] {
+        clearProgress();
+        writer->flush();
+    });
+    const Result<Decoded> decoded =
+        decodeMessages(**reader, {options.technology, options.range, progress ? progress->get() : nullptr},
+                       context, *writer);
+    clearProgress();
+    if (decoded)
+        writer->finish(*decoded);
+    else
+        report(title + ": " + decoded.reason());
+    const bool whole = reportLosses(**reader, title);
+    return decoded && whole;
+}
+
+} // namespace
+
+int runDecode(const DecodeOptions& options, Output& output) {
+    if (options.format == DecodeOptions::Format::Csv)
+        output.put(CSVRows::header(options));
+    // Standard input has one front: who reads it twice does so in turn.
+    const std::ptrdiff_t standardInputs = std::count(options.files.begin(), options.files.end(), "-");
+    const std::size_t jobs = standardInputs > 1 ? 1 : std::min(options.jobs, options.files.size());
+    bool good = true;
+    if (jobs > 1) {
+        good = runDecodeJobs(
+            options.files.size(), jobs,
+            [&](std::size_t index, Output& part) { return decodeFile(index, options, false, part); }, output);
+    } else {
+        for (std::size_t index = 0; index < options.files.size() && output.isOpen(); ++index)
+            good = decodeFile(index, options, true, output) && good;
+    }
+    output.flush();
+    return good && output.state() != Output::State::Failed ? ExitStatus::Done : ExitStatus::BadInput;
+}
+
+} // namespace velmora

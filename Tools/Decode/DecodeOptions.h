@@ -1,0 +1,31 @@
+#pragma once
+
+#include "Tools/Decode/NodeSelection.h"
+#include "Tools/Decode/TimeRange.h"
+
+#include <cstddef>
+#include <string>
+#include <vector>
+
+namespace velmora {
+
+/// `velmora-log decode`: runs each file through its technology's decoder and shows what the screens show.
+struct DecodeOptions {
+    enum class Format {
+        Text,      ///< the display tree in the end
+        Json,      ///< an object in the end
+        JsonLines, ///< an object on one line for each refresh or message
+        Csv,       ///< a row for each refresh or message
+    };
+    enum class Every { Refresh, Message };
+
+    Format format = Format::Text;
+    Every every = Every::Refresh; ///< `Message` for JsonLines and Csv alone
+    NodeSelection selection;      ///< not empty for Csv; empty where JsonLines tells of messages
+    TimeRange range;
+    std::string technology; ///< before the one that the file names; empty for that one
+    std::size_t jobs = 1;   ///< how many files are decoded side by side
+    std::vector<std::string> files;
+};
+
+} // namespace velmora

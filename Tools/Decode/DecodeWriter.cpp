@@ -1,0 +1,32 @@
+#include "Tools/Decode/DecodeWriter.h"
+
+#include "Tools/Decode/CSVRows.h"
+#include "Tools/Decode/FinalDisplay.h"
+#include "Tools/Decode/JSONLines.h"
+#include "Tools/Output.h"
+
+#include <utility>
+
+namespace velmora {
+
+std::unique_ptr<DecodeWriter> DecodeWriter::make(const DecodeOptions& options, const std::string& file,
+                                                 bool isLive, std::string heading, Output& output) {
+    using Format = DecodeOptions::Format;
+    const std::string named = options.files.size() > 1 ? file : std::string();
+    switch (options.format) {
+    case Format::JsonLines:
+        if (options.every == DecodeOptions::Every::Message)
+            return std::make_unique<MessageLines>(output, isLive, named);
+        return std::make_unique<RefreshLines>(output, isLive, options.selection, named);
+    case Format::Csv: return std::make_unique<CSVRows>(output, isLive, options, named);
+    case Format::Text:
+    case Format::Json: break;
+    }
+    return std::make_unique<FinalDisplay>(output, options, std::move(heading));
+}
+
+bool DecodeWriter::hasEnough() const {
+    return !_output.isOpen();
+}
+
+} // namespace velmora

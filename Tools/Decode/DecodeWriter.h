@@ -1,0 +1,36 @@
+#pragma once
+
+#include "Tools/Decode/DecodeOptions.h"
+#include "Tools/Decode/Decoding.h"
+
+#include <memory>
+#include <string>
+
+namespace velmora {
+
+class Output;
+
+/// What `decode` prints of a file, in one of its formats: as decoding goes on or in its end.
+class DecodeWriter : public DecodingObserver {
+public:
+    /// The writer of the options' format. `isLive`: the file may still be growing, as a pipe's other end
+    /// does. `heading` goes before what a text holds. `options` and `output` must outlive it.
+    [[nodiscard]] static std::unique_ptr<DecodeWriter> make(const DecodeOptions& options,
+                                                            const std::string& file, bool isLive,
+                                                            std::string heading, Output& output);
+
+    /// The file has been decoded to its end.
+    virtual void finish(const Decoded&) {}
+    /// Hands over all that is complete, and nothing that is not: decoding may have ended in mid-message.
+    virtual void flush() {}
+    [[nodiscard]] bool hasEnough() const override;
+
+protected:
+    explicit DecodeWriter(Output& output) : _output(output) {}
+    [[nodiscard]] Output& output() const { return _output; }
+
+private:
+    Output& _output;
+};
+
+} // namespace velmora

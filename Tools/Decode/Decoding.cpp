@@ -1,0 +1,97 @@
+#include "Tools/Decode/Decoding.h"
+
+#include "Platform/TelephonyService.h"
+#include "Tools/Decode/DecodeProgress.h"
+#include "Tools/Decode/NotedResources.h"
+#include "Tools/Decode/RecordedTime.h"
+#include "Tools/Report.h"
+#include "Tools/Technologies.h"
+
+#include <optional>
+#include <utility>
+
+namespace velmora {
+
+Result<Decoded> decodeMessages(MessageReader& reader, const DecodingRequest& request, WorkContext& context,
+                               DecodingObserver& observer) {
+    // The first message before the technology: a file may name it no earlier than there.
+    std::optional<LoggedMessage> message = reader.next();
+    const std::string& named = request.technology.empty() ? reader.technology() : request.technology;
+    RecordedClock clock;
+    const Result<std::unique_ptr<LogGenerator>> decoder = makeDecoder(named, clock);
+    if (!decoder)
+        return Failure{decoder.reason() + (named.empty() ? "; --technology supplies it" : "")};
+
+    (*decoder)->setKeepsHistory(observer.wantsHistory());
+
+    const NotedResources resources;
+    Decoded decoded;
+    decoded.technology = shortTechnologyName(named);
+    Dictionary state;
+    RecordedTicks ticks;
+    bool fileTellsRefreshes = false; // instead of the ticks
+    bool isRefreshed = true;         // since the latest wanted message
+    const auto refresh = [&](Time tick) {
+        isRefreshed = true;
+        clock.setNow(tick);
+        decoded.display = (*decoder)->generateLogUsingState(state);
+        observer.refreshed(tick, decoded);
+    };
+    MessageEffects* const effects = observer.effects();
+    const Time first = message ? message->time : Time();
+    const auto decode = [&](const LoggedMessage& logged) {
+        if (request.progress)
+            request.progress->at(logged.offset);
+        fileTellsRefreshes = fileTellsRefreshes || logged.refresh;
+        if (!request.range.contains(logged.time, first)) {
+            if (logged.refresh && !isRefreshed)
+                refresh(*logged.refresh);
+            return;
+        }
+        if (const std::optional<Time> tick = ticks.before(logged.time); tick && !fileTellsRefreshes)
+            refresh(*tick);
+        context.atRecord(logged.number, logged.offset);
+        clock.setNow(logged.time);
+        observer.messageComes(logged);
+        if (effects)
+            (*decoder)->updateStateTelling(state, logged.message, *effects);
+        else
+            (*decoder)->updateState(state, logged.message);
+        ++decoded.messages;
+        isRefreshed = false;
+        observer.messageDecoded(logged, state);
+        if (logged.refresh)
+            refresh(*logged.refresh);
+    };
+    bool more = message.has_value();
+    if (more && !observer.hasEnough())
+        decode(*message);
+    message.reset(); // gives its part of the reader's buffer back
+    while (more && !observer.hasEnough()) {
+        // Made where it is looked at instead of moved there: there are millions of them.
+        const std::optional<LoggedMessage> next = reader.next();
+        more = next.has_value();
+        if (more)
+            decode(*next);
+    }
+    if (const std::optional<Time> tick = ticks.last(); tick && !isRefreshed)
+        refresh(*tick);
+    observer.ended(**decoder, state);
+    if (!resources.failure().empty())
+        return Failure{"decoded without its template: " + resources.failure()};
+    return decoded;
+}
+
+bool reportLosses(const MessageReader& reader, const std::string& title) {
+    for (const Loss& loss : reader.losses())
+        report(placeInFile(title, loss.recordNumber, loss.offset) + ": " + loss.reason);
+    const MessageReader::LossTotals& totals = reader.lossTotals();
+    if (totals.losses > reader.losses().size())
+        report(title + ": and " + std::to_string(totals.losses - reader.losses().size()) + " more, " +
+               std::to_string(totals.bytes) + " bytes left out in all");
+    if (reader.failure())
+        report(title + ": " + reader.failure()->reason);
+    return totals.losses == 0 && !reader.failure();
+}
+
+} // namespace velmora

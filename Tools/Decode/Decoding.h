@@ -1,0 +1,65 @@
+#pragma once
+
+#include "LogGenerator/LogGenerator.h"
+#include "LogGenerator/MessageEffects.h"
+#include "Platform/Clock.h"
+#include "Platform/Result.h"
+#include "PropertyLists/Value.h"
+#include "Recording/MessageReader.h"
+#include "Tools/Decode/TimeRange.h"
+
+#include <cstdint>
+#include <string>
+
+namespace velmora {
+
+class DecodeProgress;
+class WorkContext;
+
+/// What came of decoding a file.
+struct Decoded {
+    std::string technology; ///< the short name
+    std::uint64_t messages = 0;
+    Value display; ///< as it stands after the latest refresh; none where there was nothing to show
+};
+
+/// Is told of decoding as it goes on. Displays and the state belong to the decoder: they change with the next
+/// message.
+class DecodingObserver {
+public:
+    virtual ~DecodingObserver() = default;
+
+    /// A wanted message is about to be decoded.
+    virtual void messageComes(const LoggedMessage&) {}
+    /// Who is to be told what each message concerned; asked once. Null, without which decoding is faster, for
+    /// nobody.
+    [[nodiscard]] virtual MessageEffects* effects() { return nullptr; }
+    /// Whether the decoder keeps its history, for what a snapshot saves; asked once. Decoding without is
+    /// faster.
+    [[nodiscard]] virtual bool wantsHistory() const { return false; }
+    /// A wanted message has been decoded.
+    virtual void messageDecoded(const LoggedMessage&, const Dictionary& /*state*/) {}
+    /// The display has been refreshed; `decoded` holds it, and what was decoded up to here.
+    virtual void refreshed(Time /*tick*/, const Decoded& /*decoded*/) {}
+    /// The last refresh has been; the state is as the decoder leaves it.
+    virtual void ended(const LogGenerator& /*decoder*/, const Dictionary& /*state*/) {}
+    /// Whether the rest may be left undone; asked after every message.
+    [[nodiscard]] virtual bool hasEnough() const { return false; }
+};
+
+struct DecodingRequest {
+    std::string technology; ///< before the one that the file names; empty for that one
+    TimeRange range;        ///< messages outside are passed over, as if the file did not hold them
+    DecodeProgress* progress = nullptr; ///< is kept at the message at hand, wanted or not; may be null
+};
+
+/// Runs a file's messages through the decoder of its technology, and refreshes as the application does while
+/// they arrive. `context` is kept at the record at hand. Fails, before anything is decoded, when there is no
+/// decoder, and afterwards when that had to do without its template; exceptions of the decoders pass through.
+[[nodiscard]] Result<Decoded> decodeMessages(MessageReader& reader, const DecodingRequest& request,
+                                             WorkContext& context, DecodingObserver& observer);
+
+/// Tells the user what the reader had to leave out of the file, and how it ended. Whether all of it was read.
+bool reportLosses(const MessageReader& reader, const std::string& title);
+
+} // namespace velmora

@@ -1,0 +1,47 @@
+#pragma once
+
+#include "Tools/Text/LineWriter.h"
+
+#include <string>
+
+namespace velmora {
+
+/// One JSON object a line for each refresh: its time, the technology, the number of messages so far, and the
+/// selected part of the display. The file's name goes in front where it is not empty.
+class RefreshLines final : public LineWriter {
+public:
+    RefreshLines(Output& output, bool isLive, const NodeSelection& selection, const std::string& file);
+    void refreshed(Time tick, const Decoded& decoded) override;
+
+private:
+    const NodeSelection& _selection;
+    std::string _begin;
+};
+
+/// One JSON object a line for each message: its time, its code (null for a message that was dropped), and
+/// what it concerned: "sections", "values" or, without a code, "display".
+class MessageLines final : public LineWriter, private MessageEffects {
+public:
+    MessageLines(Output& output, bool isLive, const std::string& file);
+    void messageComes(const LoggedMessage& message) override { _moment = message.time; }
+    [[nodiscard]] MessageEffects* effects() override { return this; }
+    void messageDecoded(const LoggedMessage& message, const Dictionary& state) override;
+
+private:
+    void sections(std::optional<std::uint32_t> code) override;
+    void section(std::string_view name, const Value& node) override { member(name, node); }
+    void values(std::optional<std::uint32_t> code) override;
+    void value(std::string_view key, const Value& value) override { member(key, value); }
+    void display(const Value& display) override;
+
+    void begin();
+    void appendCode(std::optional<std::uint32_t> code);
+    void member(std::string_view name, const Value& value);
+
+    std::string _begin;
+    Time _moment{};
+    std::string_view _end; ///< what ends the line at hand
+    bool _first = true;    ///< no member of it so far
+};
+
+} // namespace velmora

@@ -1,0 +1,172 @@
+#include "Tools/Decode/NodeSelection.h"
+
+#include "Model/NodePath.h"
+
+#include <algorithm>
+#include <charconv>
+#include <optional>
+
+namespace velmora {
+
+namespace {
+
+/// What is left of paths behind the path of a node: "/0" of "/Serving Cell/0" behind "/Serving Cell". The
+/// root has none of its own in front, as paths are joined.
+using Rests = std::vector<std::string_view>;
+
+/// What is left behind a child of that name, empty for the child itself; none where the path does not lead
+/// there. The reverse of appendingPathComponent.
+std::optional<std::string_view> behind(std::string_view rest, bool atRoot, std::string_view name) {
+    const std::string_view slashes = atRoot && name.empty() ? "//" : "/";
+    if (!rest.starts_with(slashes))
+        return std::nullopt;
+    rest.remove_prefix(slashes.size());
+    // A slash in the name is not told from one between names.
+    if (!rest.starts_with(name))
+        return std::nullopt;
+    rest.remove_prefix(name.size());
+    return rest.empty() || rest.front() == '/' ? std::optional(rest) : std::nullopt;
+}
+
+std::string_view nameOf(std::string_view key, bool isSorted) {
+    return isSorted ? nameOfSortedKey(key) : key;
+}
+
+const Value* findBehind(const Value& value, std::string_view rest, bool atRoot);
+
+const Value* findIn(const Dictionary& dictionary, std::string_view rest, bool atRoot) {
+    const bool isSorted = dictionary.contains(sortedMarker);
+    const Value* found = nullptr;
+    const std::string* foundKey = nullptr;
+    for (const auto& [key, child] : dictionary) {
+        if (key == sortedMarker || child.isNone())
+            continue;
+        const std::optional<std::string_view> left = behind(rest, atRoot, nameOf(key, isSorted));
+        // The later row: in a sorted dictionary the one of the greater key.
+        if (!left || (isSorted && foundKey && key < *foundKey))
+            continue;
+        if (const Value* inside = left->empty() ? &child : findBehind(child, *left, false)) {
+            found = inside;
+            foundKey = &key;
+        }
+    }
+    return found;
+}
+
+const Value* findIn(const Array& array, std::string_view rest, bool atRoot) {
+    const std::string_view number = rest.substr(1, rest.find('/', 1) - 1);
+    std::size_t index = 0;
+    const auto [end, error] = std::from_chars(number.data(), number.data() + number.size(), index);
+    if (error != std::errc() || end != number.data() + number.size() || index >= array.size())
+        return nullptr;
+    // Only the number as the tree writes it: "0", not "00".
+    const std::optional<std::string_view> left = behind(rest, atRoot, std::to_string(index));
+    if (!left)
+        return nullptr;
+    return left->empty() ? &array[index] : findBehind(array[index], *left, false);
+}
+
+/// Precondition: `rest` is not empty.
+const Value* findBehind(const Value& value, std::string_view rest, bool atRoot) {
+    if (const Dictionary* dictionary = value.asDictionary())
+        return findIn(*dictionary, rest, atRoot);
+    if (const Array* array = value.asArray())
+        return findIn(*array, rest, atRoot);
+    return nullptr;
+}
+
+/// How a child stands to the paths that lead through its parent.
+struct Share {
+    bool isSelected = false; ///< all of it
+    Rests inside;            ///< else these paths lead into it
+};
+
+Share shareOf(const Rests& rests, bool atRoot, std::string_view name) {
+    Share share;
+    for (const std::string_view rest : rests)
+        if (const std::optional<std::string_view> left = behind(rest, atRoot, name)) {
+            if (left->empty())
+                share.isSelected = true;
+            else
+                share.inside.push_back(*left);
+        }
+    return share;
+}
+
+Value restrictedBehind(const Value& value, const Rests& rests, bool atRoot);
+
+/// What of the child is selected, or none.
+Value selectedPart(const Value& child, const Share& share) {
+    if (share.isSelected)
+        return child;
+    return share.inside.empty() ? Value() : restrictedBehind(child, share.inside, false);
+}
+
+Value restrictedBehind(const Value& value, const Rests& rests, bool atRoot) {
+    if (const Dictionary* dictionary = value.asDictionary()) {
+        const bool isSorted = dictionary->contains(sortedMarker);
+        const DictionaryRef result = makeDictionary();
+        bool hasAny = false;
+        for (const auto& [key, child] : *dictionary) {
+            Value part = key == sortedMarker
+                             ? child
+                             : selectedPart(child, shareOf(rests, atRoot, nameOf(key, isSorted)));
+            if (part.isNone())
+                continue;
+            hasAny = hasAny || key != sortedMarker;
+            result->set(key, std::move(part));
+        }
+        return hasAny ? Value(result) : Value();
+    }
+    if (const Array* array = value.asArray()) {
+        const ArrayRef result = makeArray();
+        for (std::size_t i = 0; i < array->size(); ++i) {
+            Value part = selectedPart((*array)[i], shareOf(rests, atRoot, std::to_string(i)));
+            if (part.isNone())
+                continue;
+            while (result->size() < i)
+                result->append(Value());
+            result->append(std::move(part));
+        }
+        return result->empty() ? Value() : Value(result);
+    }
+    return {};
+}
+
+NodeRef restrictedBehind(const VelmoraModelNode& node, const Rests& rests, bool atRoot) {
+    std::vector<NodeRef> children;
+    if (const std::vector<NodeRef>* all = node.childNodes())
+        for (const NodeRef& child : *all) {
+            const Share share = shareOf(rests, atRoot, child->displayName());
+            if (share.isSelected)
+                children.push_back(child);
+            else if (NodeRef part =
+                         share.inside.empty() ? nullptr : restrictedBehind(*child, share.inside, false))
+                children.push_back(std::move(part));
+        }
+    if (children.empty())
+        return nullptr;
+    return std::make_shared<VelmoraModelTreeNode>(node.displayName(), std::move(children));
+}
+
+} // namespace
+
+const Value* NodeSelection::find(const Value& display, std::string_view path) {
+    if (display.isNone())
+        return nullptr;
+    return path == rootNodePath ? &display : findBehind(display, path, true);
+}
+
+Value NodeSelection::restricted(const Value& display) const {
+    return selectsAll() ? display : restrictedBehind(display, Rests(_paths.begin(), _paths.end()), true);
+}
+
+NodeRef NodeSelection::restricted(const NodeRef& root) const {
+    return selectsAll() ? root : restrictedBehind(*root, Rests(_paths.begin(), _paths.end()), true);
+}
+
+bool NodeSelection::selectsAll() const {
+    return _paths.empty() || std::find(_paths.begin(), _paths.end(), rootNodePath) != _paths.end();
+}
+
+} // namespace velmora

@@ -1,0 +1,44 @@
+#pragma once
+
+#include "Model/VelmoraModelNode.h"
+#include "PropertyLists/Value.h"
+
+#include <string>
+#include <string_view>
+#include <utility>
+#include <vector>
+
+namespace velmora {
+
+/// The parts of a display that a user has selected by the paths of the display tree ("/Serving Cell/ARFCN",
+/// "/Neighboring Cells/0"). Works on the display dictionary itself, where building the tree would cost more
+/// than all else. Where several rows have one path, `find` gives the one that the path leads to, the later;
+/// the restricted displays keep them all.
+class NodeSelection {
+public:
+    /// Precondition: each path is one that `isPath`. Without paths everything is selected.
+    explicit NodeSelection(std::vector<std::string> paths) : _paths(std::move(paths)) {}
+    NodeSelection() = default;
+
+    /// Whether the text may be a path: it begins with a slash.
+    [[nodiscard]] static bool isPath(std::string_view text) { return text.starts_with('/'); }
+
+    [[nodiscard]] const std::vector<std::string>& paths() const { return _paths; }
+
+    /// The value of the node at the path; null where there is none. Belongs to the display.
+    [[nodiscard]] static const Value* find(const Value& display, std::string_view path);
+
+    /// The display with nothing in it but the selected nodes and what leads to them: their keys, "_sorted"
+    /// markers, and, before a selected element of an array, none in the place of each that is not selected.
+    /// None where nothing is selected. Shares the selected nodes with the display.
+    [[nodiscard]] Value restricted(const Value& display) const;
+    /// The same of a tree; null where nothing is selected.
+    [[nodiscard]] NodeRef restricted(const NodeRef& root) const;
+
+private:
+    [[nodiscard]] bool selectsAll() const;
+
+    std::vector<std::string> _paths;
+};
+
+} // namespace velmora

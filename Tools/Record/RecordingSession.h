@@ -1,0 +1,78 @@
+#pragma once
+
+#include "Platform/Clock.h"
+#include "Platform/Linux/Files/FileDescriptor.h"
+#include "Platform/Result.h"
+#include "Recording/Pcapng/RecordingWriter.h"
+
+#include <cstdint>
+#include <memory>
+#include <optional>
+#include <string>
+#include <string_view>
+
+namespace velmora {
+
+/// A recording in the making: the file is there from the beginning, so that trouble with it is told at once;
+/// it gets its head when the technology is known. One that never comes so far leaves no file behind. One that
+/// is overwritten gives way to the new one in one step, head and all. Main thread only.
+class RecordingSession {
+public:
+    /// Opens the file, "-" being standard output. A regular file that is there already is refused unless
+    /// `force`; even then it keeps its content until the technology is known.
+    static Result<std::unique_ptr<RecordingSession>> open(const std::string& path, bool force);
+
+    ~RecordingSession();
+    RecordingSession(const RecordingSession&) = delete;
+    RecordingSession& operator=(const RecordingSession&) = delete;
+
+    /// The service has named the technology. The first time this begins the recording; another one after that
+    /// is a failure.
+    Result<Done> learnTechnology(std::string_view technology);
+    /// A message has arrived. A failure ends the recording; trouble that may pass is none (see `trouble`).
+    /// Precondition: the technology is known.
+    Result<Done> append(Time time, Bytes message);
+    /// Hands what there is to the system, and has it begin to put that on the medium; nothing before the
+    /// technology is known. Tries again where there was trouble. A failure is as above.
+    Result<Done> save();
+    /// Ends the recording. Trouble that is left is a failure now.
+    Result<Done> close();
+
+    /// The technology's short name; empty while it is unknown.
+    [[nodiscard]] const std::string& technology() const { return _technology; }
+    /// Messages that arrived and were not dropped, those that wait included.
+    [[nodiscard]] std::uint64_t messages() const { return _writer ? _writer->messages() : 0; }
+    /// The bytes of these.
+    [[nodiscard]] std::uint64_t bytes() const { return _bytes; }
+    /// Those of these that are not in the file.
+    [[nodiscard]] recordingBlocks::PacketCount unsaved() const {
+        return _writer ? _writer->unsaved() : recordingBlocks::PacketCount();
+    }
+    /// Messages for which there was no room while the file could not be written.
+    [[nodiscard]] std::uint64_t dropped() const { return _writer ? _writer->droppedMessages() : 0; }
+    /// Why the file cannot be written at the moment; empty when it can. The messages wait.
+    [[nodiscard]] const std::string& trouble() const { return _trouble; }
+    /// Whether there is no more room for messages to wait.
+    [[nodiscard]] bool isDropping() const { return _writer && _writer->isDropping(); }
+    /// Whether the recording goes to a pipe that nobody reads any more.
+    [[nodiscard]] bool hasLostReader() const;
+    /// Takes away the file that this has made, as long as there is nothing in it: for a program that ends
+    /// without a destructor. Asks for no memory.
+    void removeIfEmpty() const;
+
+private:
+    explicit RecordingSession(std::string path) : _path(std::move(path)) {}
+
+    /// Keeps trouble that may pass, and lets it pass for success.
+    [[nodiscard]] Result<Done> unlessItMayPass(Result<Done> result);
+
+    std::string _path;
+    FileDescriptor _file;  ///< until the writer has it
+    bool _created = false; ///< the file is ours to remove
+    std::unique_ptr<RecordingWriter> _writer;
+    std::string _technology;
+    std::string _trouble;
+    std::uint64_t _bytes = 0;
+};
+
+} // namespace velmora

@@ -1,0 +1,24 @@
+#pragma once
+
+#include "Platform/Clock.h"
+#include "Tools/Text/TextBuffer.h"
+
+#include <chrono>
+#include <cstddef>
+
+namespace velmora {
+
+/// Writes moments as "2026-11-16T05:00:00.000000000Z" (RFC 3339, UTC, always nine digits of fraction, so that
+/// they sort as text). Remembers the day, whose calendar date is what costs.
+class TimeText {
+public:
+    static constexpr std::size_t length = 30;
+
+    void append(TextBuffer& out, Time moment);
+
+private:
+    std::chrono::sys_days _day = std::chrono::sys_days::max();
+    char _date[10] = {};
+};
+
+} // namespace velmora

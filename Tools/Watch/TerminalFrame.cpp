@@ -1,0 +1,142 @@
+#include "Tools/Watch/TerminalFrame.h"
+
+#include "Tools/Text/PrintableText.h"
+
+#include <algorithm>
+
+namespace velmora {
+
+namespace {
+
+constexpr const char* home = "\x1b[H";
+constexpr const char* clearToEndOfLine = "\x1b[K";
+constexpr const char* bold = "\x1b[1m";
+constexpr const char* reverse = "\x1b[7m";
+constexpr const char* plain = "\x1b[0m";
+
+/// Columns grow in such steps, so that a value which gains a digit does not move the whole screen.
+constexpr std::size_t widthStep = 8;
+
+/// The longest sequence that a key sends, and more.
+constexpr std::size_t longestSequence = 16;
+
+std::string statusLine(std::string_view status, const ScreenLayout& layout, std::size_t scroll,
+                       std::size_t columns) {
+    std::string right;
+    if (layout.maximumScroll() != 0 && layout.pageSize() != 0)
+        right = std::to_string(scroll + 1) + "-" + std::to_string(scroll + layout.pageSize()) + "/" +
+                std::to_string(layout.rows);
+    std::string left = clipped(status, columns);
+    const std::size_t used = displayWidth(left) + right.size();
+    if (used + 1 > columns)
+        right.clear();
+    left.append(columns - displayWidth(left) - right.size(), ' ');
+    return reverse + left + right + plain;
+}
+
+} // namespace
+
+ScreenLayout layoutOf(const std::vector<TreeRow>& rows, ScreenSize size) {
+    ScreenLayout layout;
+    layout.rows = rows.size();
+    layout.rowsPerColumn = size.rows > 1 ? size.rows - 1 : 0;
+    layout.columnWidth = size.columns;
+    if (layout.rowsPerColumn == 0 || rows.empty())
+        return layout;
+    std::size_t widest = 0;
+    for (const TreeRow& row : rows)
+        widest = std::max(widest, displayWidth(row.text));
+    const std::size_t width = (widest / widthStep + 1) * widthStep;
+    const std::size_t needed = (rows.size() + layout.rowsPerColumn - 1) / layout.rowsPerColumn;
+    const std::size_t fitting = (size.columns + columnGap) / (width + columnGap);
+    layout.columns = std::clamp<std::size_t>(fitting, 1, needed);
+    if (layout.columns > 1)
+        layout.columnWidth = (size.columns - columnGap * (layout.columns - 1)) / layout.columns;
+    return layout;
+}
+
+std::string composeFrame(const std::vector<TreeRow>& rows, std::string_view status, ScreenSize size,
+                         std::size_t scroll) {
+    const ScreenLayout layout = layoutOf(rows, size);
+    const std::size_t first = std::min(scroll, layout.maximumScroll());
+    std::string frame = home;
+    for (std::size_t line = 0; line < layout.rowsPerColumn; ++line) {
+        std::size_t column = 0;
+        for (std::size_t i = 0; i < layout.columns; ++i) {
+            const std::size_t index = first + i * layout.rowsPerColumn + line;
+            if (index >= rows.size())
+                break;
+            const std::size_t start = i * (layout.columnWidth + columnGap);
+            frame.append(start - column, ' ');
+            const std::string text = clipped(rows[index].text, layout.columnWidth);
+            column = start + displayWidth(text);
+            frame += rows[index].isBranch ? bold + text + plain : text;
+        }
+        // After a full line the cursor still stands on its last character, which clearing would take away.
+        if (column < size.columns)
+            frame += clearToEndOfLine;
+        frame += "\r\n";
+    }
+    frame += statusLine(status, layout, first, size.columns);
+    return frame;
+}
+
+std::vector<Key> KeyReader::take(std::string_view bytes) {
+    struct Sequence {
+        std::string_view bytes;
+        Key key;
+    };
+    static constexpr Sequence sequences[] = {
+        {"k", Key::Up},         {"\x1b[A", Key::Up},   {"\x1bOA", Key::Up},      {"j", Key::Down},
+        {"\x1b[B", Key::Down},  {"\x1bOB", Key::Down}, {"\x1b[5~", Key::PageUp}, {"\x1b[6~", Key::PageDown},
+        {" ", Key::PageDown},   {"\x1b[H", Key::Home}, {"\x1bOH", Key::Home},    {"\x1b[1~", Key::Home},
+        {"\x1b[7~", Key::Home}, {"\x1b[F", Key::End},  {"\x1bOF", Key::End},     {"\x1b[4~", Key::End},
+        {"\x1b[8~", Key::End},  {"q", Key::Quit},      {"\x03", Key::Quit},
+    };
+    std::vector<Key> keys;
+    _pending += bytes;
+    while (!_pending.empty()) {
+        const auto whole =
+            std::find_if(std::begin(sequences), std::end(sequences),
+                         [this](const Sequence& sequence) { return _pending.starts_with(sequence.bytes); });
+        if (whole != std::end(sequences)) {
+            keys.push_back(whole->key);
+            _pending.erase(0, whole->bytes.size());
+            continue;
+        }
+        const bool begun =
+            std::any_of(std::begin(sequences), std::end(sequences),
+                        [this](const Sequence& sequence) { return sequence.bytes.starts_with(_pending); });
+        if (begun)
+            break;
+        // A key that means nothing here: its sequence goes as a whole, so that its last letter is no key.
+        std::size_t length = 1;
+        if (_pending[0] == '\x1b' && _pending.size() > 1 && (_pending[1] == '[' || _pending[1] == 'O')) {
+            const std::size_t end =
+                _pending.find_first_of("ABCDEFGHIJKLMNOPQRSTUVWXYZabcdefghijklmnopqrstuvwxyz~", 2);
+            if (end == std::string::npos && _pending.size() < longestSequence)
+                break;
+            length = end == std::string::npos ? _pending.size() : end + 1;
+        }
+        _pending.erase(0, length);
+    }
+    return keys;
+}
+
+std::size_t scrolledBy(Key key, std::size_t scroll, const ScreenLayout& layout) {
+    const std::size_t last = layout.maximumScroll();
+    const std::size_t page = std::max<std::size_t>(layout.pageSize(), 1);
+    scroll = std::min(scroll, last);
+    switch (key) {
+    case Key::Up: return scroll - std::min<std::size_t>(scroll, 1);
+    case Key::Down: return std::min(scroll + 1, last);
+    case Key::PageUp: return scroll - std::min(scroll, page);
+    case Key::PageDown: return std::min(scroll + page, last);
+    case Key::Home: return 0;
+    case Key::End: return last;
+    case Key::Quit: break;
+    }
+    return scroll;
+}
+
+} // namespace velmora

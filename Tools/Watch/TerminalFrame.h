@@ -1,0 +1,59 @@
+#pragma once
+
+#include "Tools/Text/TreeText.h"
+
+#include <cstddef>
+#include <string>
+#include <string_view>
+#include <vector>
+
+namespace velmora {
+
+/// What a terminal shows of the display tree, as plain functions: no terminal is needed to say what is on it.
+
+struct ScreenSize {
+    std::size_t columns = 80;
+    std::size_t rows = 24;
+};
+
+/// How rows are laid out on a screen: in columns that are read one after the other, as many as the rows need
+/// and the window has width for, above the status line, which is the last row.
+struct ScreenLayout {
+    std::size_t columns = 1;
+    std::size_t columnWidth = 0;   ///< terminal columns
+    std::size_t rowsPerColumn = 0; ///< 0 in a window that has room for the status line alone
+    std::size_t rows = 0;          ///< rows in all, shown or not
+
+    /// Rows that are on the screen at the same time.
+    [[nodiscard]] std::size_t pageSize() const { return columns * rowsPerColumn; }
+    /// The furthest that it makes sense to scroll: the last row is then the last on the screen.
+    [[nodiscard]] std::size_t maximumScroll() const { return rows > pageSize() ? rows - pageSize() : 0; }
+};
+
+/// The terminal columns between two columns of rows.
+inline constexpr std::size_t columnGap = 3;
+
+[[nodiscard]] ScreenLayout layoutOf(const std::vector<TreeRow>& rows, ScreenSize size);
+
+/// The bytes that draw the screen anew, over whatever it shows: no part of it is blank in between. `scroll`
+/// is the first row shown; one past the layout's maximum counts as the maximum.
+[[nodiscard]] std::string composeFrame(const std::vector<TreeRow>& rows, std::string_view status,
+                                       ScreenSize size, std::size_t scroll);
+
+/// A key that means something to the screen.
+enum class Key { Up, Down, PageUp, PageDown, Home, End, Quit };
+
+/// Tells keys from the bytes that a terminal sends for them. Sequences may come in pieces; what means nothing
+/// is passed over.
+class KeyReader {
+public:
+    [[nodiscard]] std::vector<Key> take(std::string_view bytes);
+
+private:
+    std::string _pending; ///< the beginning of a sequence
+};
+
+/// Where the screen is scrolled to after a key. `Quit` scrolls nowhere.
+[[nodiscard]] std::size_t scrolledBy(Key key, std::size_t scroll, const ScreenLayout& layout);
+
+} // namespace velmora

@@ -1,0 +1,132 @@
+#include "Tools/Watch/WatchCommand.h"
+
+#include "Platform/DateText.h"
+#include "Platform/Linux/Files/LargeMemory.h"
+#include "Platform/Linux/SignalWatcher.h"
+#include "Tools/ExitStatus.h"
+#include "Tools/Output.h"
+#include "Tools/Report.h"
+#include "Tools/ServiceClient.h"
+#include "Tools/Watch/WatchView.h"
+
+#include <chrono>
+#include <functional>
+#include <memory>
+#include <string>
+#include <string_view>
+#include <utility>
+
+namespace velmora {
+
+namespace {
+
+using namespace std::chrono_literals;
+
+/// How often the connection and the pipe are looked at between refreshes.
+constexpr auto statusInterval = 250ms;
+constexpr const char* connecting = "Connecting...";
+
+/// A model that tells when it meets another technology than the one before. A model's display is that of the
+/// technology it met first, and stays so; what another one reports takes another model.
+class WatchModel final : public VelmoraModel {
+public:
+    WatchModel(ModelPlatform platform, ModelObserver* observer, std::function<void()> technologyChanged)
+        : VelmoraModel(std::move(platform), observer), _technologyChanged(std::move(technologyChanged)) {}
+
+protected:
+    [[nodiscard]] std::unique_ptr<LogGenerator>
+    generatorFromTechnology(std::string_view technology) override {
+        if (!_technology.empty() && _technology != technology)
+            _technologyChanged();
+        _technology = technology;
+        return VelmoraModel::generatorFromTechnology(technology);
+    }
+
+private:
+    std::function<void()> _technologyChanged;
+    std::string _technology;
+};
+
+/// The model's observer: hands each refresh to the view, and keeps the status line true in between.
+class Watcher final : public ModelObserver {
+public:
+    Watcher(const WatchOptions& options, Output& output, ServiceClient& client)
+        : _client(client), _once(options.once), _model(newModel()) {
+        if (!_once && Terminal::isThere())
+            _view = std::make_unique<ScreenView>([this] { _client.loop.quit(ExitStatus::Done); });
+        else
+            _view = std::make_unique<PipeView>(output);
+    }
+
+    /// Until the user, a signal or a closed pipe ends it.
+    int run() {
+        const WorkContext context(serviceTitle, [this] {
+            _model->destroyPorts();
+            _view->leave();
+        });
+        const SignalWatcher signals([this](int) { _client.loop.quit(ExitStatus::Done); });
+        _client.queue.async([this] { _model->restartMonitor(); });
+        // The first look comes after the first attempt to connect.
+        _client.queue.async([this] { lookAround(); });
+        _statusTimer = _client.queue.repeating(statusInterval, [this] { lookAround(); });
+        const int status = _client.loop.run();
+        _statusTimer.reset();
+        _model->destroyPorts();
+        return status;
+    }
+
+    void updateViewControllerFromModel() override {
+        const NodeRef root = _model->topLevelNodes();
+        if (_model->isConnected())
+            _updateMessage = "Updated " + localDateAndTime(_client.clock, _client.clock.now(), " at ");
+        _shownStatus = status();
+        _view->showRefresh(_shownStatus, root ? treeRows(*root) : std::vector<TreeRow>());
+        if (_once || !_view->isOpen())
+            _client.loop.quit(ExitStatus::Done);
+    }
+
+private:
+    [[nodiscard]] std::shared_ptr<VelmoraModel> newModel() {
+        return std::make_shared<WatchModel>(_client.platform(), this,
+                                            [this] { _client.queue.async([this] { beginAnew(); }); });
+    }
+
+    void beginAnew() {
+        _model->destroyPorts();
+        _model = newModel();
+        _model->restartMonitor();
+    }
+
+    [[nodiscard]] std::string status() const { return _model->isConnected() ? _updateMessage : connecting; }
+
+    void lookAround() {
+        if (!_view->isOpen()) {
+            _client.loop.quit(ExitStatus::Done);
+            return;
+        }
+        // Connected again, but without news: the line stays until there are some.
+        if (_once || _model->isConnected() || _shownStatus == connecting)
+            return;
+        _shownStatus = connecting;
+        _view->showStatus(_shownStatus);
+    }
+
+    ServiceClient& _client;
+    bool _once;
+    std::shared_ptr<VelmoraModel> _model;
+    std::unique_ptr<WatchView> _view;
+    std::unique_ptr<Timer> _statusTimer;
+    std::string _updateMessage = connecting;
+    std::string _shownStatus;
+};
+
+} // namespace
+
+int runWatch(const WatchOptions& options, Output& output) {
+    giveBackLargeMemory();
+    ServiceClient client;
+    const int status = Watcher(options, output, client).run();
+    return output.state() == Output::State::Failed ? ExitStatus::BadInput : status;
+}
+
+} // namespace velmora

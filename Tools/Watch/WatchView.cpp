@@ -1,0 +1,61 @@
+#include "Tools/Watch/WatchView.h"
+
+#include <utility>
+
+#include <unistd.h>
+
+namespace velmora {
+
+void PipeView::showRefresh(const std::string& status, std::vector<TreeRow> rows) {
+    std::string block = std::exchange(_begun, true) ? "\n" : "";
+    block += status + "\n";
+    for (const TreeRow& row : rows)
+        block += row.text + "\n";
+    _output.put(block);
+    _output.flush();
+}
+
+void PipeView::showStatus(const std::string& status) {
+    showRefresh(status, {});
+}
+
+ScreenView::ScreenView(std::function<void()> quit)
+    : _quit(std::move(quit)), _heldLog(::isatty(STDERR_FILENO) != 0 ? std::make_unique<HeldLog>() : nullptr),
+      _terminal(
+          {[this](std::string_view bytes) { takeInput(bytes); }, [this] { draw(); }, [this] { _quit(); }}) {}
+
+void ScreenView::showRefresh(const std::string& status, std::vector<TreeRow> rows) {
+    _status = status;
+    _rows = std::move(rows);
+    draw();
+}
+
+void ScreenView::showStatus(const std::string& status) {
+    _status = status;
+    draw();
+}
+
+void ScreenView::leave() {
+    _terminal.restore();
+    if (_heldLog)
+        _heldLog->release();
+}
+
+void ScreenView::takeInput(std::string_view bytes) {
+    const std::size_t before = _scroll;
+    for (const Key key : _keys.take(bytes)) {
+        if (key == Key::Quit) {
+            _quit();
+            return;
+        }
+        _scroll = scrolledBy(key, _scroll, layoutOf(_rows, _terminal.size()));
+    }
+    if (_scroll != before)
+        draw();
+}
+
+void ScreenView::draw() {
+    _terminal.draw(composeFrame(_rows, _status, _terminal.size(), _scroll));
+}
+
+} // namespace velmora

@@ -1,0 +1,66 @@
+#pragma once
+
+#include "Tools/LogSubstitute.h"
+#include "Tools/Output.h"
+#include "Tools/Text/TreeText.h"
+#include "Tools/Watch/Terminal.h"
+
+#include <functional>
+#include <memory>
+#include <string>
+#include <vector>
+
+namespace velmora {
+
+/// Where `watch` shows what it sees. Main thread only.
+class WatchView {
+public:
+    virtual ~WatchView() = default;
+    /// A refresh: the status line and the display tree's rows.
+    virtual void showRefresh(const std::string& status, std::vector<TreeRow> rows) = 0;
+    /// The connection is lost, or there again; the rows are as they were.
+    virtual void showStatus(const std::string& status) = 0;
+    /// Whether there is anybody left to show it to.
+    [[nodiscard]] virtual bool isOpen() const = 0;
+    /// Gives the terminal back, if one is in use.
+    virtual void leave() {}
+};
+
+/// Prints each refresh in turn, headed by the status line, a blank line between two.
+class PipeView final : public WatchView {
+public:
+    explicit PipeView(Output& output) : _output(output) {}
+    void showRefresh(const std::string& status, std::vector<TreeRow> rows) override;
+    void showStatus(const std::string& status) override;
+    [[nodiscard]] bool isOpen() const override { return _output.isOpen() && !_output.hasLostReader(); }
+
+private:
+    Output& _output;
+    bool _begun = false;
+};
+
+/// Keeps the terminal showing the latest refresh. Log lines wait until the screen is left where they would
+/// run into it.
+class ScreenView final : public WatchView {
+public:
+    /// `quit` is called when the user wants to end, or the terminal is gone.
+    explicit ScreenView(std::function<void()> quit);
+    void showRefresh(const std::string& status, std::vector<TreeRow> rows) override;
+    void showStatus(const std::string& status) override;
+    [[nodiscard]] bool isOpen() const override { return true; }
+    void leave() override;
+
+private:
+    void takeInput(std::string_view bytes);
+    void draw();
+
+    std::function<void()> _quit;
+    std::unique_ptr<HeldLog> _heldLog; ///< declared before the terminal: it speaks once the screen is left
+    Terminal _terminal;
+    KeyReader _keys;
+    std::string _status;
+    std::vector<TreeRow> _rows;
+    std::size_t _scroll = 0;
+};
+
+} // namespace velmora
