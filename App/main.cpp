@@ -1,3 +1,6 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
 #include "App/LinuxAppPlatform.h"
 #include "App/SelfTest.h"
 #include "App/VelmoraApp.h"

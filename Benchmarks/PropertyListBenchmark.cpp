@@ -1,3 +1,6 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
 // How long the property lists take that arrive with log messages: the SIM files and the cell information.
 
 #include "PropertyLists/PropertyList.h"

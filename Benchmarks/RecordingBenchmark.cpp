@@ -1,3 +1,6 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
 #include "Recording/Files/DescriptorFile.h"
 #include "Recording/Pcapng/RecordingReader.h"
 #include "Recording/Pcapng/RecordingWriter.h"

@@ -1,3 +1,6 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
 // What a fuzzing engine calls. VELMORA_FUZZ_TARGET is the function that makes the target.
 
 #include "Fuzz/FuzzTargets.h"

@@ -1,3 +1,6 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
 // make-seeds DIRECTORY: what the fuzzers start from. For every target a directory of its name with an input a
 // file, and NAME.dict with its words as the fuzzing engine reads them. Prints the targets' names and how long
 // their inputs get.

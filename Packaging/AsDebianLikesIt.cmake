@@ -1,3 +1,5 @@
+# SPDX-FileCopyrightText: 2026 Velmora contributors
+# SPDX-License-Identifier: MIT
 # Run by cpack on the staged trees before they become packages.
 
 # Manual pages and change logs are compressed, without the time, so that the packages depend on nothing but the source.

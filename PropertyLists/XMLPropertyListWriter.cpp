@@ -1,3 +1,6 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
 #include "PropertyLists/PropertyList.h"
 #include "PropertyLists/PropertyListDate.h"
 #include "PropertyLists/XMLScalars.h"

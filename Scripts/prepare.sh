@@ -1,3 +1,5 @@
+# SPDX-FileCopyrightText: 2026 Velmora contributors
+# SPDX-License-Identifier: MIT
 # shellcheck shell=bash
 # What ./run and ./test share: installing what is missing, configuring, building. Sourced, not run.
 

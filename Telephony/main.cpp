@@ -1,3 +1,6 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
 #include "Platform/Clock.h"
 #include "Platform/Linux/MainLoop.h"
 #include "Platform/Linux/Ports/LinuxMessagePorts.h"

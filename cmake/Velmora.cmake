@@ -1,3 +1,5 @@
+# SPDX-FileCopyrightText: 2026 Velmora contributors
+# SPDX-License-Identifier: MIT
 # What every target of the project is built with, and the helpers that declare them.
 
 add_library(velmora_options INTERFACE)

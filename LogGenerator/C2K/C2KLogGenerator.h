@@ -1,3 +1,6 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
 #pragma once
 
 #include "LogGenerator/C2K/Targets.h"

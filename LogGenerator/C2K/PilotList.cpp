@@ -1,3 +1,6 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
 #include "LogGenerator/C2K/PilotList.h"
 
 #include "LogGenerator/Fields/NumberFormat.h"

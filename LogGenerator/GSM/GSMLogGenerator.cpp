@@ -1,3 +1,6 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
 #include "LogGenerator/GSM/GSMLogGenerator.h"
 
 #include "LogGenerator/GSM/AssertionFailure.h"

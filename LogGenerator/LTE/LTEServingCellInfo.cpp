@@ -1,3 +1,6 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
 #include "LogGenerator/LTE/LTEServingCellInfo.h"
 
 #include "LogGenerator/Extra/CellFields.h"

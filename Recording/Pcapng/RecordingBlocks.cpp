@@ -1,3 +1,6 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
 #include "Recording/Pcapng/RecordingBlocks.h"
 
 #include "LogMessages/FieldReader.h"

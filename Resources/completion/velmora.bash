@@ -1,3 +1,5 @@
+# SPDX-FileCopyrightText: 2026 Velmora contributors
+# SPDX-License-Identifier: MIT
 # shellcheck shell=bash
 # Completion of Velmora's programs for bash, by way of bash-completion, which loads it under each one's name.
 

@@ -1,3 +1,5 @@
+-- SPDX-FileCopyrightText: 2026 Velmora contributors
+-- SPDX-License-Identifier: MIT
 -- Wireshark dissector for Velmora's recordings: the log messages of a cellular modem, one a packet, on link
 -- type USER0. Loaded from Wireshark's directory of Lua plugins, or with -X lua_script:velmora.lua.
 --

@@ -1,3 +1,6 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
 #include "Telephony/ModemManager/ModemObjects.h"
 
 #include "Telephony/ModemManager/ModemManagerNames.h"

@@ -1,3 +1,5 @@
+# SPDX-FileCopyrightText: 2026 Velmora contributors
+# SPDX-License-Identifier: MIT
 """Uses the application as somebody with a screen reader does, from outside, through the accessibility tree.
 
 The real service and the real application run as processes. The walk goes two panes down and back, saves a

@@ -1,3 +1,6 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
 #include "App/VelmoraSaveView.h"
 #include "Tests/App/SaveScreenFixture.h"
 #include "Toolkit/Screen.h"

@@ -1,3 +1,6 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
 // Preloaded into a program (LD_PRELOAD), this makes chosen calls of it fail: the N-th of a kind, once, a few
 // times in a row, or for good. What is counted begins with `main`, so that N means the same in every run, and
 // includes all threads and the children that the program forks.

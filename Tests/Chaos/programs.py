@@ -1,3 +1,5 @@
+# SPDX-FileCopyrightText: 2026 Velmora contributors
+# SPDX-License-Identifier: MIT
 """What the scripts of this folder share: the programs in a directory of their own, and waiting for them."""
 
 import os

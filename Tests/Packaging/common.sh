@@ -1,3 +1,5 @@
+# SPDX-FileCopyrightText: 2026 Velmora contributors
+# SPDX-License-Identifier: MIT
 # shellcheck shell=bash
 # What the packaging checks share; sourced with the build tree as the first argument.
 set -euo pipefail

@@ -1,3 +1,6 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
 #include "Platform/Linux/Files/FileDescriptor.h"
 #include "Platform/Linux/Ports/FrameQueue.h"
 #include "Platform/Linux/Ports/FrameReader.h"

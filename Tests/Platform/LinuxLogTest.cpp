@@ -1,3 +1,6 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
 #include "Platform/Linux/Files/FileDescriptor.h"
 #include "Platform/Linux/ProgramLog.h"
 #include "Platform/Linux/StderrLog.h"

@@ -1,3 +1,6 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
 // Lists go to another implementation of both forms, Python's plistlib, and come back from it: what Velmora
 // writes must mean there what it meant here, and the other way round.
 

@@ -1,3 +1,6 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
 #include "Recording/Pcapng/RecordingWriter.h"
 #include "Telephony/Drives/DriveScenario.h"
 #include "Telephony/Drives/ScenarioRegistry.h"

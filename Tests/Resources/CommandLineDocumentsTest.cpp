@@ -1,3 +1,6 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
 #include "Platform/TelephonyService.h"
 #include "Telephony/Drives/ScenarioRegistry.h"
 #include "Tests/Resources/DissectorSections.h"

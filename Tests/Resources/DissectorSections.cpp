@@ -1,3 +1,6 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
 #include "Tests/Resources/DissectorSections.h"
 
 #include "LogGenerator/C2K/LogCodeParsers.h"

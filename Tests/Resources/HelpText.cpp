@@ -1,3 +1,6 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
 #include "Tests/Resources/HelpText.h"
 
 #include "Tests/Support/ShellCommand.h"

@@ -1,4 +1,6 @@
 #!/usr/bin/env bash
+# SPDX-FileCopyrightText: 2026 Velmora contributors
+# SPDX-License-Identifier: MIT
 # Prints what bash would offer at the end of a command line, one word a line: complete.bash 'velmora-log de'
 set -u
 # shellcheck source=/dev/null

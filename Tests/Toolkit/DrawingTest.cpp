@@ -1,3 +1,6 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
 // What is on the screen, read back from pictures of it.
 
 #include "Tests/Toolkit/ToolkitTest.h"

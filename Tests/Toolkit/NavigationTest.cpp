@@ -1,3 +1,6 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
 #include "Tests/Toolkit/ToolkitTest.h"
 
 #include "Toolkit/Bars/SaveButton.h"

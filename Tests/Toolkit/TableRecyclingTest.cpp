@@ -1,3 +1,6 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
 // Which cells rows get: as they leave and enter the screen, and on a reload. A row is 44 points high with the
 // test machine's font (20 points of air around a line of 15), and the list has 604 - 52 (header) = 552
 // points.

@@ -1,3 +1,6 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
 #include "Toolkit/Widgets/Accessibility.h"
 
 #include "Toolkit/Tables/TableCell.h"

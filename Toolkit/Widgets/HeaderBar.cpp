@@ -1,3 +1,6 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
 #include "Toolkit/Widgets/HeaderBar.h"
 
 #include "Toolkit/Widgets/Conversions.h"

@@ -1,3 +1,6 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
 #include "LogGenerator/C2K/OneX/TrafficFER.h"
 
 #include "LogGenerator/C2K/OneX/FrameErrorAverage.h"

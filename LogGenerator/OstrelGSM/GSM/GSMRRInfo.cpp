@@ -1,3 +1,6 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
 #include "LogGenerator/OstrelGSM/GSM/GSMRRInfo.h"
 
 #include "Platform/SystemLog.h"

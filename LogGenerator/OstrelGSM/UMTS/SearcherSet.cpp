@@ -1,3 +1,6 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
 #include "LogGenerator/OstrelGSM/UMTS/SearcherSet.h"
 
 #include "LogGenerator/OstrelGSM/UMTS/SearcherRecord.h"

@@ -1,3 +1,6 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
 #include "Platform/Linux/Ports/LinuxRemotePort.h"
 
 #include "Platform/Linux/Errno.h"

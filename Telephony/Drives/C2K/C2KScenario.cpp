@@ -1,3 +1,6 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
 #include "Telephony/Drives/C2K/C2KScenario.h"
 
 #include "Platform/TelephonyService.h"

@@ -1,3 +1,6 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
 #include "Telephony/Drives/LTE/LTEReports.h"
 
 #include "Telephony/Drives/ServiceRecords.h"

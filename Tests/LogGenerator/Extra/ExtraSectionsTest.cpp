@@ -1,3 +1,6 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
 #include "LogGenerator/Extra/ExtraPayload.h"
 #include "LogGenerator/Extra/PDPContextList.h"
 #include "LogGenerator/Extra/SimInfo.h"

@@ -1,3 +1,6 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
 #include "LogGenerator/LTE/LTEClassIndex.h"
 #include "Tests/LogGenerator/TemplateCheck.h"
 

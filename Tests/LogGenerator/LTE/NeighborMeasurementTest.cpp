@@ -1,3 +1,6 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
 #include "LogGenerator/LTE/NeighborCellsList.h"
 #include "LogGenerator/LTE/NeighborMeasurementMisc.h"
 #include "Tests/LogGenerator/LTE/BitFields.h"

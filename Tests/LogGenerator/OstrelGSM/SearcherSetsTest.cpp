@@ -1,3 +1,6 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
 #include "LogGenerator/OstrelGSM/UMTS/ActiveSet.h"
 #include "LogGenerator/OstrelGSM/UMTS/DetectedSet.h"
 #include "LogGenerator/OstrelGSM/UMTS/MonitoredSet.h"

@@ -1,3 +1,6 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
 #include "Platform/TelephonyService.h"
 #include "Tests/Telephony/Drives/C2KLayouts.h"
 #include "Tests/Telephony/Drives/DisplayTesting.h"

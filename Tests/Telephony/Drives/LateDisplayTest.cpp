@@ -1,3 +1,6 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
 #include "LogGenerator/LogGenerator.h"
 #include "Telephony/Drives/ScenarioRegistry.h"
 #include "Tests/Support/CapturedLog.h"

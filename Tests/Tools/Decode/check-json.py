@@ -1,3 +1,5 @@
+# SPDX-FileCopyrightText: 2026 Velmora contributors
+# SPDX-License-Identifier: MIT
 """Checks JSON against a schema: check-json.py SCHEMA < TEXT
 
 One object a line, or several indented ones one behind the other where the first line is not one whole object.
