@@ -1,0 +1,1 @@
+"""The parts of Tests/compare-builds."""
