@@ -5,6 +5,7 @@
 
 #include "Platform/Bytes.h"
 
+#include <array>
 #include <bit>
 #include <cstddef>
 #include <cstdint>
@@ -21,7 +22,7 @@ namespace velmora {
 ///     offset 5   time stamp 64 bits   see RecordTime.h
 ///     offset 13  payload
 ///
-/// This is the one place that says so. A LogMessage is a view: it allocates nothing and does not own the
+/// A LogMessage is a view: it allocates nothing and does not own the
 /// bytes. (The messages of the IFX technology are property lists and have no header.)
 struct LogMessage {
     static constexpr std::size_t prefixLength = 2;
@@ -55,6 +56,11 @@ struct LogMessage {
         parsed.code = numberAt<std::uint16_t>(&parsed.record[codeOffset], std::endian::little);
         return parsed;
     }
+
+    /// The header of a record, as `parse` reads it. The length field shows its largest value for a payload
+    /// that is too long for it.
+    [[nodiscard]] static std::array<std::uint8_t, headerLength>
+    header(std::uint8_t type, std::uint16_t code, std::size_t payloadLength, std::uint64_t timestamp = 0);
 
     /// The code by which decoders subscribe.
     [[nodiscard]] std::uint32_t logCode() const { return (type == extraType ? firstExtraCode : 0) + code; }

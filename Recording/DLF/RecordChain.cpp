@@ -6,7 +6,7 @@
 #include "LogMessages/DLFVersionReport.h"
 #include "LogMessages/FieldReader.h"
 #include "LogMessages/LogCodes.h"
-#include "LogMessages/RecordHeader.h"
+#include "LogMessages/LogMessage.h"
 #include "LogMessages/RecordTime.h"
 
 #include <algorithm>
@@ -18,7 +18,7 @@ namespace velmora {
 namespace {
 
 /// A record less its type byte: length, code, time stamp.
-constexpr std::size_t bareHeader = RecordHeader::size - 1;
+constexpr std::size_t bareHeader = LogMessage::headerLength - 1;
 constexpr std::uint16_t lastExtraCode = 2;
 constexpr std::uint32_t extraStream = 0xFF0000;
 
@@ -43,7 +43,7 @@ constexpr int sure = 20;
 } // namespace Evidence
 
 bool isStream(std::uint8_t type) {
-    return type == RecordHeader::basebandType || type == RecordHeader::extraType;
+    return type == LogMessage::basebandType || type == LogMessage::extraType;
 }
 
 /// `nearby`: the time stamp of a record close to it.
@@ -70,8 +70,8 @@ std::size_t RecordChain::sizeOf(Lead lead) {
     case Lead::Nothing: return 0;
     case Lead::Type:
     case Lead::OtherType: return 1;
-    case Lead::CutPrefix: return RecordHeader::prefixSize;
-    case Lead::Prefix: return RecordHeader::prefixSize + 1;
+    case Lead::CutPrefix: return LogMessage::prefixLength;
+    case Lead::Prefix: return LogMessage::prefixLength + 1;
     }
     return 0;
 }
@@ -137,13 +137,13 @@ std::optional<RecordChain::Candidate> RecordChain::candidateAt(std::size_t at, L
     if (!mayHave(lead) || !_input.ensure(at + leadSize + bareHeader))
         return std::nullopt;
     const Bytes bytes = _input.available().subspan(at);
-    const std::uint8_t type = leadSize == 0 ? RecordHeader::basebandType : bytes[leadSize - 1];
+    const std::uint8_t type = leadSize == 0 ? LogMessage::basebandType : bytes[leadSize - 1];
     Candidate candidate;
     candidate.lead = lead;
     switch (lead) {
     case Lead::Nothing: break;
     case Lead::Prefix:
-        if (bytes[0] != RecordHeader::prefixMarker)
+        if (bytes[0] != LogMessage::prefixMarker)
             return std::nullopt;
         candidate.evidence = Evidence::prefix + (isStream(type) ? Evidence::type : 0);
         break;
@@ -166,7 +166,7 @@ std::optional<RecordChain::Candidate> RecordChain::candidateAt(std::size_t at, L
     candidate.code = fields.u16(2);
     candidate.timestamp = fields.u64(4);
     candidate.evidence += evidenceOfTimestamp(candidate.timestamp, nearby);
-    const std::uint32_t stream = type == RecordHeader::extraType ? extraStream : 0;
+    const std::uint32_t stream = type == LogMessage::extraType ? extraStream : 0;
     if (candidate.isVersionReport())
         candidate.evidence += Evidence::versionReport;
     // Zeros that count as no time do not count as a code of the extra stream besides.
@@ -234,9 +234,9 @@ RecordChain::Record RecordChain::take(const Candidate& candidate) {
     record.isVersionReport = candidate.isVersionReport();
     std::optional<std::uint8_t> missing;
     if (candidate.lead == Lead::Nothing)
-        missing = candidate.code <= lastExtraCode ? RecordHeader::extraType : RecordHeader::basebandType;
+        missing = candidate.code <= lastExtraCode ? LogMessage::extraType : LogMessage::basebandType;
     else if (candidate.lead == Lead::CutPrefix)
-        missing = RecordHeader::prefixMarker;
+        missing = LogMessage::prefixMarker;
     if (!missing) {
         record.message = _input.part(0, candidate.size);
         return record;
@@ -254,8 +254,8 @@ RecordChain::Record RecordChain::take(const Candidate& candidate) {
 void RecordChain::passDamage(const Survey& survey) {
     Loss loss;
     loss.offset = _input.offset();
-    const bool isShort =
-        !survey.plain && !survey.cutOff && !_input.ensure(RecordHeader::prefixSize + RecordHeader::size);
+    const bool isShort = !survey.plain && !survey.cutOff &&
+                         !_input.ensure(LogMessage::prefixLength + LogMessage::headerLength);
     bool found = false;
     while (!found && _input.ensure(1)) {
         _input.skip(1);
@@ -265,7 +265,8 @@ void RecordChain::passDamage(const Survey& survey) {
     const std::optional<Candidate>& header = survey.plain ? survey.plain : survey.cutOff;
     if (isShort && !found)
         loss.reason = std::to_string(loss.bytes) + " bytes at the end, wanted a record of " +
-                      std::to_string(_layout == Layout::DLF ? bareHeader : RecordHeader::size) + " at least";
+                      std::to_string(_layout == Layout::DLF ? bareHeader : LogMessage::headerLength) +
+                      " at least";
     else if (!found && survey.cutOff)
         loss.reason = "record cut off after " + std::to_string(loss.bytes) + " of " +
                       std::to_string(survey.cutOff->size) + " bytes";

@@ -6,7 +6,7 @@
 #include "LogMessages/DLFVersionReport.h"
 #include "LogMessages/FieldReader.h"
 #include "LogMessages/LogCodes.h"
-#include "LogMessages/RecordHeader.h"
+#include "LogMessages/LogMessage.h"
 #include "LogMessages/RecordTime.h"
 
 #include <algorithm>
@@ -23,7 +23,7 @@ namespace {
 class Votes {
 public:
     void add(Bytes message) {
-        const std::optional<RecordHeader> header = recordHeader(message);
+        const std::optional<LogMessage> header = LogMessage::parse(message);
         const unsigned wanted = header ? technologiesOfCode(header->logCode()) : 0;
         for (unsigned bit = 0; bit < technologyBits; ++bit)
             _votes[bit] += wanted >> bit & 1;

@@ -39,10 +39,10 @@ enum class MemberOf : std::uint8_t {
 
 /// What a member feeds.
 enum class Feeds : std::uint8_t {
-    Cell,        ///< a cell dictionary of the cell information array (0xFF0001)
+    Cell,        ///< a cell dictionary of the cell information array
     ServingCell, ///< the same, of the serving cell alone, where the cell itself has no such key
-    SIMFile,     ///< the SIM's files (0xFF0000)
-    Bearer,      ///< a bearer's dictionary of display values among the packet-data contexts (0xFF0002)
+    SIMFile,     ///< the SIM's files
+    Bearer,      ///< a bearer's dictionary of display values among the packet-data contexts
     Link,        ///< every bearer's dictionary: the radio link that carries it
     Service,     ///< no record: the service itself goes by it
     Nothing,     ///< it is left unused

@@ -66,5 +66,22 @@ TEST(LogMessage, ofAPrefixedMessageOf13BytesHasNoWholeTimestampAndNoPayload) {
     EXPECT_TRUE(parsed->payload().empty());
 }
 
+Data headerOf(std::uint8_t type, std::uint16_t code, std::size_t payloadLength, std::uint64_t timestamp) {
+    return Data::copyOf(LogMessage::header(type, code, payloadLength, timestamp));
+}
+
+TEST(LogMessage, writesAHeader) {
+    EXPECT_EQ(headerOf(0xFF, 0xD0E0, 1, 0x0102030405060708), hex(R"(FF                      # type
+                                                                    0D 00                   # length
+                                                                    E0 D0                   # code
+                                                                    08 07 06 05 04 03 02 01 # time stamp)"));
+}
+
+TEST(LogMessage, writesTheLargestLengthForAPayloadThatIsTooLong) {
+    EXPECT_EQ(headerOf(1, 0x1234, 65'523, 0), hex("01 FFFF 3412 0000000000000000"));
+    EXPECT_EQ(headerOf(1, 0x1234, 65'522, 0), hex("01 FEFF 3412 0000000000000000"));
+    EXPECT_EQ(headerOf(1, 0x1234, 65'536, 0), hex("01 FFFF 3412 0000000000000000"));
+}
+
 } // namespace
 } // namespace velmora

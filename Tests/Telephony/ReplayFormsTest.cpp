@@ -2,7 +2,7 @@
 // SPDX-License-Identifier: MIT
 
 #include "LogGenerator/LogGenerator.h"
-#include "LogMessages/RecordHeader.h"
+#include "LogMessages/LogMessage.h"
 #include "Platform/Resources.h"
 #include "Platform/TelephonyService.h"
 #include "PropertyLists/PropertyList.h"
@@ -105,7 +105,7 @@ protected:
     /// What the raw material of a display keeps of a message that came: none where that cannot be told apart
     /// from what follows it.
     [[nodiscard]] std::optional<Data> kept(const Data& message) const {
-        const auto header = recordHeader(message.bytes());
+        const auto header = LogMessage::parse(message.bytes());
         if (technology == "IFX")
             return message;
         if (!header)
@@ -281,7 +281,7 @@ TEST_P(ReplayFormsTest, dlfLogOfManyBuffers) {
         const bool isFirst = std::exchange(buffer, event.offset / 2s) != buffer;
         const Bytes bytes = event.message.bytes().subspan(isFirst ? 1 : 0);
         dlf.insert(dlf.end(), bytes.begin(), bytes.end());
-        if (event.message.size() < RecordHeader::size) {
+        if (event.message.size() < LogMessage::headerLength) {
             lost += bytes.size();
             continue;
         }
