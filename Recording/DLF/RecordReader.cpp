@@ -4,9 +4,9 @@
 #include "Recording/DLF/RecordReader.h"
 
 #include "LogMessages/DLFVersionReport.h"
-#include "LogMessages/FieldReader.h"
 #include "LogMessages/LogCodes.h"
 #include "LogMessages/LogMessage.h"
+#include "LogMessages/Record.h"
 #include "LogMessages/RecordTime.h"
 
 #include <algorithm>
@@ -83,9 +83,8 @@ std::optional<RecordChain::Record> RecordReader::nextRecord(RecordChain& chain, 
         ++_number;
         if (!record->isVersionReport)
             return record;
-        FieldReader fields(record->message.bytes(), false);
-        // Type byte and report.
-        const std::uint32_t written = fields.u32(1 + dlfVersionReportTimeOffset);
+        // The message has a type byte before the report.
+        const std::uint32_t written = Record(record->message).u32(1 + dlfVersionReportTimeOffset);
         if (!_lastTime && written != 0)
             _lastTime = Time(std::chrono::seconds(written));
     }
