@@ -3,9 +3,9 @@
 
 #include "Recording/Pcapng/RecordingReader.h"
 
-#include "LogMessages/FieldReader.h"
 #include "Platform/TelephonyService.h"
 #include "Recording/Files/FileSource.h"
+#include "Recording/Pcapng/FieldReader.h"
 #include "Recording/Pcapng/Pcapng.h"
 
 #include <algorithm>

@@ -6,8 +6,8 @@
 #include "Platform/Bytes.h"
 #include "Platform/Clock.h"
 #include "Platform/Result.h"
+#include "Recording/Files/RecordingFile.h"
 #include "Recording/Pcapng/RecordingBlocks.h"
-#include "Recording/Pcapng/RecordingFile.h"
 
 #include <cstddef>
 #include <cstdint>

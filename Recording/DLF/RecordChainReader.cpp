@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Recording/DLF/RecordReader.h"
+#include "Recording/DLF/RecordChainReader.h"
 
 #include "LogMessages/DLFVersionReport.h"
 #include "LogMessages/LogCodes.h"
@@ -45,7 +45,7 @@ private:
 
 } // namespace
 
-std::optional<LoggedMessage> RecordReader::next() {
+std::optional<LoggedMessage> RecordChainReader::next() {
     if (_ahead.empty())
         return read();
     LoggedMessage message = std::move(_ahead.front());
@@ -53,7 +53,7 @@ std::optional<LoggedMessage> RecordReader::next() {
     return message;
 }
 
-void RecordReader::lookAhead() {
+void RecordChainReader::lookAhead() {
     constexpr std::size_t decisiveLead = 3;
     Votes votes;
     std::size_t bytes = 0;
@@ -70,7 +70,7 @@ void RecordReader::lookAhead() {
         _technology = votes.first();
 }
 
-std::optional<RecordChain::Record> RecordReader::nextRecord(RecordChain& chain, std::string_view place) {
+std::optional<RecordChain::Record> RecordChainReader::nextRecord(RecordChain& chain, std::string_view place) {
     for (;;) {
         std::optional<RecordChain::Record> record = chain.next();
         if (std::optional<Loss> loss = chain.takeLoss()) {
@@ -90,11 +90,11 @@ std::optional<RecordChain::Record> RecordReader::nextRecord(RecordChain& chain, 
     }
 }
 
-void RecordReader::loseRecord(std::uint64_t bytes, std::string reason) {
+void RecordChainReader::loseRecord(std::uint64_t bytes, std::string reason) {
     addLoss({0, bytes, ++_number, std::move(reason), false});
 }
 
-Time RecordReader::timeOf(const RecordChain::Record& record) {
+Time RecordChainReader::timeOf(const RecordChain::Record& record) {
     const std::optional<Time> time = timeOfRecord(record.timestamp);
     if (time && record.timestamp != 0)
         _lastTime = time;
