@@ -1,8 +1,10 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
+#include "LogMessages/LogMessage.h"
 #include "Platform/Bytes.h"
 
+#include <bit>
 #include <cstdint>
 #include <cstdio>
 #include <cstring>
@@ -23,9 +25,6 @@ constexpr std::size_t blockHeader = 8;
 constexpr std::size_t blockOverhead = 12;
 constexpr std::size_t packetHeader = 28;
 constexpr std::size_t largestBlock = std::size_t{17} << 20;
-constexpr std::size_t recordHeader = 13;
-constexpr std::size_t prefixLength = 2;
-constexpr std::uint8_t prefixMarker = 0x81;
 constexpr std::size_t chunkSize = std::size_t{1} << 20;
 
 std::uint32_t u32(const std::uint8_t* bytes) {
@@ -89,15 +88,16 @@ private:
     }
 
     void frame(Bytes message) {
-        if (message.size() < recordHeader)
+        const auto parsed = LogMessage::parse(message);
+        if (!parsed)
             return;
-        const Bytes record = message[0] == prefixMarker ? message.subspan(prefixLength) : message;
+        const Bytes record = parsed->record;
         if (record.size() > _record.size())
             _record.resize(record.size());
         std::memcpy(_record.data(), record.data(), record.size());
         ++_totals.records;
         _totals.bytes += record.size();
-        _totals.codes += static_cast<std::uint64_t>(_record[3] | _record[4] << 8);
+        _totals.codes += numberAt<std::uint16_t>(&_record[LogMessage::codeOffset], std::endian::little);
     }
 
     std::vector<std::uint8_t> _chunk = std::vector<std::uint8_t>(chunkSize);

@@ -3,7 +3,7 @@
 
 #include "Fuzz/DriveMessages.h"
 
-#include "LogMessages/RecordHeader.h"
+#include "LogMessages/LogMessage.h"
 #include "Telephony/Drives/ScenarioRegistry.h"
 
 #include <map>
@@ -18,7 +18,7 @@ std::vector<Data> driveMessages(std::string_view scenario, std::chrono::seconds 
     std::map<std::tuple<bool, bool, std::uint8_t, std::uint16_t>, std::size_t> met;
     std::vector<Data> messages;
     for (ScenarioEvent event = drive->next(); event.offset < duration; event = drive->next()) {
-        const auto header = hasRecords ? recordHeader(event.message.bytes()) : std::nullopt;
+        const auto header = hasRecords ? LogMessage::parse(event.message.bytes()) : std::nullopt;
         std::size_t& count = header ? met[{true, header->prefixed, header->type, header->code}]
                                     : met[{false, false, std::uint8_t{0}, std::uint16_t{0}}];
         if (count++ < each)

@@ -3,7 +3,7 @@
 
 #include "Fuzz/MessageScript.h"
 
-#include "LogMessages/RecordHeader.h"
+#include "LogMessages/LogMessage.h"
 
 #include <algorithm>
 #include <array>
@@ -14,8 +14,7 @@ namespace {
 
 enum StepByte : std::uint8_t { Baseband, Extra, Prefixed, Raw, Redraw, Reconnect, stepBytes };
 
-constexpr std::size_t headerLength = RecordHeader::size;
-constexpr std::array<std::uint8_t, RecordHeader::prefixSize> prefix = {RecordHeader::prefixMarker, 0};
+constexpr std::array<std::uint8_t, LogMessage::prefixLength> prefix = {LogMessage::prefixMarker, 0};
 
 void putU16(std::vector<std::uint8_t>& bytes, std::size_t value) {
     bytes.push_back(static_cast<std::uint8_t>(value));
@@ -24,24 +23,23 @@ void putU16(std::vector<std::uint8_t>& bytes, std::size_t value) {
 
 Data recordMessage(std::uint8_t kind, std::uint16_t code, Bytes payload) {
     std::vector<std::uint8_t> bytes;
-    bytes.reserve(prefix.size() + headerLength + payload.size());
+    const auto type = kind == Extra ? LogMessage::extraType : LogMessage::basebandType;
+    const auto header = LogMessage::header(type, code, payload.size());
+    bytes.reserve(prefix.size() + header.size() + payload.size());
     if (kind == Prefixed)
         bytes.insert(bytes.end(), prefix.begin(), prefix.end());
-    bytes.push_back(kind == Extra ? RecordHeader::extraType : RecordHeader::basebandType);
-    putU16(bytes, headerLength - 1 + payload.size());
-    putU16(bytes, code);
-    bytes.resize(bytes.size() + 8);
+    bytes.insert(bytes.end(), header.begin(), header.end());
     bytes.insert(bytes.end(), payload.begin(), payload.end());
     return Data(std::move(bytes));
 }
 
 /// Which of the steps makes such a record; none where only a raw message does.
-std::optional<std::uint8_t> recordKind(const std::optional<RecordHeader>& header) {
-    if (!header || header->record.size() < headerLength)
+std::optional<std::uint8_t> recordKind(const std::optional<LogMessage>& header) {
+    if (!header || header->record.size() < LogMessage::headerLength)
         return std::nullopt;
-    if (header->type == RecordHeader::basebandType)
+    if (header->type == LogMessage::basebandType)
         return header->prefixed ? Prefixed : Baseband;
-    if (header->type == RecordHeader::extraType && !header->prefixed)
+    if (header->type == LogMessage::extraType && !header->prefixed)
         return Extra;
     return std::nullopt;
 }
@@ -87,11 +85,11 @@ std::vector<std::uint8_t> MessageScript::encode(const Step& step) {
         return {step.kind == Kind::Redraw ? Redraw : Reconnect};
     std::vector<std::uint8_t> bytes;
     Bytes content = step.message.bytes();
-    if (const std::optional<std::uint8_t> kind = recordKind(recordHeader(content))) {
-        const RecordHeader header = *recordHeader(content);
+    const std::optional<LogMessage> record = LogMessage::parse(content);
+    if (const std::optional<std::uint8_t> kind = recordKind(record)) {
         bytes.push_back(*kind);
-        putU16(bytes, header.code);
-        content = header.record.subspan(headerLength);
+        putU16(bytes, record->code);
+        content = record->payload();
     } else {
         bytes.push_back(Raw);
     }

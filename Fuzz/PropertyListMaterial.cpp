@@ -5,7 +5,7 @@
 #include "Fuzz/DriveMessages.h"
 #include "Fuzz/FuzzMaterials.h"
 #include "Fuzz/MaterialTools.h"
-#include "LogMessages/RecordHeader.h"
+#include "LogMessages/LogMessage.h"
 #include "Tests/PropertyLists/PropertyListSamples.h"
 
 namespace velmora {
@@ -51,10 +51,9 @@ constexpr std::string_view xmlWords[] = {
 /// The lists of the messages that hold one.
 void addLists(std::vector<Data>& seeds, std::string_view scenario) {
     for (const Data& message : driveMessages(scenario, std::chrono::minutes(2), 1)) {
-        const auto header = recordHeader(message.bytes());
-        const Bytes payload = header && header->type == RecordHeader::extraType
-                                  ? header->record.subspan(RecordHeader::size)
-                                  : message.bytes();
+        const auto header = LogMessage::parse(message.bytes());
+        const Bytes payload =
+            header && header->type == LogMessage::extraType ? header->payload() : message.bytes();
         if (const auto list = readPropertyList(payload))
             addBothForms(seeds, *list);
     }

@@ -5,7 +5,7 @@
 #include "Fuzz/FuzzTargets.h"
 #include "Fuzz/MessageScript.h"
 #include "Fuzz/SameValue.h"
-#include "LogMessages/RecordHeader.h"
+#include "LogMessages/LogMessage.h"
 
 #include <algorithm>
 #include <array>
@@ -28,7 +28,7 @@ constexpr Remembered remembered[] = {
 };
 
 bool isRemembered(const FuzzedTechnology& technology, const Data& message) {
-    const auto header = recordHeader(message.bytes());
+    const auto header = LogMessage::parse(message.bytes());
     return header && std::any_of(std::begin(remembered), std::end(remembered), [&](const Remembered& each) {
                return each.templateName == technology.templateName && each.code == header->logCode();
            });

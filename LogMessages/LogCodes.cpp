@@ -3,6 +3,7 @@
 
 #include "LogMessages/LogCodes.h"
 
+#include "LogMessages/LogMessage.h"
 #include "Platform/TelephonyService.h"
 
 #include <algorithm>
@@ -67,9 +68,9 @@ constexpr Row rows[] = {
     {0xD00E, utran},
     {0xD0E0, utran},
     {0xD0E2, utran},
-    {0xFF0000, gsm | lte | utran},
-    {0xFF0001, gsm | lte | utran},
-    {0xFF0002, gsm | lte | utran},
+    {ExtraCode::simFiles, gsm | lte | utran},
+    {ExtraCode::cellInformation, gsm | lte | utran},
+    {ExtraCode::packetDataContexts, gsm | lte | utran},
 };
 
 constexpr auto before = [](const Row& a, const Row& b) { return a.code < b.code; };

@@ -11,8 +11,8 @@ namespace velmora {
 /// The binary log technologies, of which sets are made, one bit each.
 inline constexpr unsigned technologyBits = 4;
 
-/// The technologies whose decoders want a log code (0xFF0000 added for the extra stream), as a set. Nobody
-/// here may ask the decoders; a test holds this against them.
+/// The technologies whose decoders want a log code (see LogMessage::logCode), as a set. This room may not
+/// include the decoders; a test compares the table with them.
 [[nodiscard]] std::uint8_t technologiesOfCode(std::uint32_t logCode);
 
 /// The short name of the technology of a bit, which is counted from 0.

@@ -58,6 +58,10 @@ public:
     [[nodiscard]] std::int32_t i32(std::size_t offset) const {
         return static_cast<std::int32_t>(u32(offset));
     }
+    [[nodiscard]] std::uint64_t u64(std::size_t offset) const {
+        expect(offset, 8);
+        return numberAt<std::uint64_t>(&_bytes[offset], std::endian::little);
+    }
     [[nodiscard]] std::uint16_t u16BigEndian(std::size_t offset) const {
         return static_cast<std::uint16_t>(u8(offset) << 8 | u8(offset + 1));
     }

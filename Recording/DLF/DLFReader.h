@@ -3,7 +3,7 @@
 
 #pragma once
 
-#include "Recording/DLF/RecordReader.h"
+#include "Recording/DLF/RecordChainReader.h"
 
 #include <memory>
 #include <string_view>
@@ -20,7 +20,7 @@ namespace velmora {
 /// log was written as its version report has it; without that, for the beginning of system time, 1980-01-06.
 /// Offsets are places in the file, and records are counted from 1, version reports included. Memory is
 /// bounded whatever the file holds; who keeps messages for long, copies them. Main thread only.
-class DLFReader final : public RecordReader {
+class DLFReader final : public RecordChainReader {
 public:
     /// Opens an input of which nothing has been skipped, and looks ahead for its technology. Fails when it
     /// cannot be read, or does not begin as a DLF log does. `wanted`: what the reason says was wanted.

@@ -4,7 +4,8 @@
 #include "Recording/DLF/DLFWriter.h"
 
 #include "LogMessages/DLFVersionReport.h"
-#include "LogMessages/RecordHeader.h"
+#include "LogMessages/LogMessage.h"
+#include "Recording/DLF/ImpliedType.h"
 #include "Recording/Files/DescriptorFile.h"
 
 #include <cerrno>
@@ -20,17 +21,16 @@ namespace velmora {
 namespace {
 
 constexpr std::size_t flushThreshold = std::size_t{64} << 10;
-constexpr std::uint16_t lastExtraCode = 2;
 
 /// Why the message cannot be followed in a log; empty where it can.
 std::string whyUnfit(Bytes message) {
-    const std::optional<RecordHeader> header = recordHeader(message);
-    if (!header || header->record.size() < RecordHeader::size)
+    const std::optional<LogMessage> parsed = LogMessage::parse(message);
+    if (!parsed || parsed->record.size() < LogMessage::headerLength)
         return "message of " + std::to_string(message.size()) + " bytes, wanted a record header of " +
-               std::to_string(RecordHeader::size) + " at least";
-    if (header->length != header->record.size() - 1)
-        return "record length " + std::to_string(header->length) + " in a message whose record has " +
-               std::to_string(header->record.size() - 1) + " bytes behind its type";
+               std::to_string(LogMessage::headerLength) + " at least";
+    if (parsed->length() != parsed->record.size() - 1)
+        return "record length " + std::to_string(parsed->length()) + " in a message whose record has " +
+               std::to_string(parsed->record.size() - 1) + " bytes behind its type";
     return {};
 }
 
@@ -76,10 +76,9 @@ Result<Done> DLFWriter::append(Bytes message) {
         ++_refused;
         return Failure{std::move(reason)};
     }
-    const RecordHeader header = *recordHeader(message);
-    const std::uint8_t toldType =
-        header.code <= lastExtraCode ? RecordHeader::extraType : RecordHeader::basebandType;
-    const Bytes kept = !header.prefixed && header.type == toldType ? message.subspan(1) : message;
+    const LogMessage parsed = *LogMessage::parse(message);
+    const bool impliesType = !parsed.prefixed && parsed.type == impliedType(parsed.code);
+    const Bytes kept = message.subspan(impliesType ? 1 : 0);
     _buffer.insert(_buffer.end(), kept.begin(), kept.end());
     ++_messages;
     return _buffer.size() < flushThreshold ? Done{} : flush();

@@ -6,7 +6,7 @@
 #include "Platform/Bytes.h"
 #include "Platform/Clock.h"
 #include "Platform/Result.h"
-#include "Recording/Pcapng/RecordingFile.h"
+#include "Recording/Files/RecordingFile.h"
 
 #include <cstdint>
 #include <memory>

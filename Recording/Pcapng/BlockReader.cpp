@@ -3,8 +3,8 @@
 
 #include "Recording/Pcapng/BlockReader.h"
 
-#include "LogMessages/FieldReader.h"
 #include "Recording/Files/InputBegin.h"
+#include "Recording/Pcapng/FieldReader.h"
 #include "Recording/Pcapng/Pcapng.h"
 
 #include <algorithm>

@@ -3,7 +3,7 @@
 
 #include "Recording/Pcapng/RecordingBlocks.h"
 
-#include "LogMessages/FieldReader.h"
+#include "Recording/Pcapng/FieldReader.h"
 #include "Recording/Pcapng/Pcapng.h"
 
 #include <algorithm>

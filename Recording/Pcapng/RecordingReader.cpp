@@ -3,9 +3,9 @@
 
 #include "Recording/Pcapng/RecordingReader.h"
 
-#include "LogMessages/FieldReader.h"
 #include "Platform/TelephonyService.h"
 #include "Recording/Files/FileSource.h"
+#include "Recording/Pcapng/FieldReader.h"
 #include "Recording/Pcapng/Pcapng.h"
 
 #include <algorithm>
@@ -38,7 +38,7 @@ Result<std::unique_ptr<RecordingReader>> RecordingReader::open(ChunkedInput inpu
     std::unique_ptr<RecordingReader> reader(new RecordingReader(std::move(input)));
     if (const Result<Done> section = reader->_blocks.expectSection(); !section)
         return Failure{section.reason()};
-    while (!reader->_settled) {
+    while (!reader->_foundInterface) {
         const Block* const block = reader->nextBlock();
         if (!block)
             break;
@@ -112,7 +112,7 @@ void RecordingReader::takeInInterface(const Block& block) {
         ++_passedOver.interfaces;
         return;
     }
-    _settled = true;
+    _foundInterface = true;
     const std::string_view name = shortTechnologyName(interface.description.name);
     if (_technology.empty())
         _technology = name;

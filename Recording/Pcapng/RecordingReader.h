@@ -81,7 +81,7 @@ private:
     BlockReader _blocks;
     const Block* _waiting = nullptr;    ///< the packet that `open` came upon
     std::vector<Interface> _interfaces; ///< of the present section
-    bool _settled = false;              ///< an interface of log messages has been met
+    bool _foundInterface = false;       ///< an interface of log messages has been met
     std::string _technology;
     std::uint64_t _packets = 0; ///< packet blocks met
     Time _lastTime{};

@@ -92,15 +92,15 @@ Result<Done> RecordingWriter::append(Time time, Bytes message) {
 Result<Done> RecordingWriter::flush() {
     if (_failure)
         return *_failure;
-    // What trouble has left behind the last whole block goes first.
+    // What a temporary failure has left after the last whole block is cut off first.
     if (const int error = _trouble ? _file->cutTo(_end) : 0; error != 0) {
-        stumble("write", error);
+        noteFailure("write", error);
         return outcome();
     }
     for (Bytes rest = waiting(); !rest.empty();) {
         const RecordingFile::Written written = _file->write(rest);
         if (written.error != 0) {
-            stumble("write", written.error);
+            noteFailure("write", written.error);
             return outcome();
         }
         _end += written.bytes;
@@ -115,8 +115,8 @@ Result<Done> RecordingWriter::flush() {
 
 Result<Done> RecordingWriter::sync() {
     _keeps = _file->isRegular();
-    // A medium that failed is tried again by the next call, so that this one tells of it.
-    if (!takeSyncOutcome())
+    // A sync that failed is retried by the next call, so that this one returns the failure.
+    if (!collectSync())
         return outcome();
     if (Result<Done> flushed = flush(); !flushed)
         return flushed;
@@ -132,9 +132,9 @@ Result<Done> RecordingWriter::close() {
     if (!_file)
         return outcome();
     Result<Done> flushed = flush();
-    // Where all that the medium refused has been kept, it gets a second try.
-    if (flushed && _file->isRegular() && !settle() && _base == _synced && (flushed = flush()))
-        static_cast<void>(settle());
+    // Where all that was not synced has been kept, it is retried once.
+    if (flushed && _file->isRegular() && !syncNow() && _base == _synced && (flushed = flush()))
+        static_cast<void>(syncNow());
     if (const int error = _file->close(); error != 0 && outcome())
         _failure = failureOf("close", error);
     _file.reset();
@@ -153,25 +153,25 @@ Result<Done> RecordingWriter::outcome() const {
     return Done{};
 }
 
-bool RecordingWriter::takeSyncOutcome() {
+bool RecordingWriter::collectSync() {
     const std::optional<int> error = _syncIsUnderWay ? _file->takeSyncOutcome() : std::nullopt;
     if (!error)
         return true;
     _syncIsUnderWay = false;
-    return takeMediumsWord(*error, _syncing);
+    return applySyncResult(*error, _syncing);
 }
 
-bool RecordingWriter::settle() {
+bool RecordingWriter::syncNow() {
     _syncIsUnderWay = false;
-    return takeMediumsWord(_file->sync(), _end);
+    return applySyncResult(_file->sync(), _end);
 }
 
-bool RecordingWriter::takeMediumsWord(int error, std::uint64_t end) {
-    // Some file systems have nothing to put anywhere, and say so.
+bool RecordingWriter::applySyncResult(int error, std::uint64_t end) {
+    // Some file systems cannot sync, and say so with an error that does not count.
     if (mayPass(error)) {
-        // What is not known to be on the medium is written once more.
+        // What has not been synced is written again.
         _end = _base;
-        stumble("write", error);
+        noteFailure("write", error);
         return false;
     }
     _synced = end;
@@ -180,7 +180,7 @@ bool RecordingWriter::takeMediumsWord(int error, std::uint64_t end) {
     return true;
 }
 
-void RecordingWriter::stumble(const char* operation, int error) {
+void RecordingWriter::noteFailure(const char* operation, int error) {
     _end = _base + recordingBlocks::wholeBlocks(_buffer, written());
     const bool passing = mayPass(error) && _file->isRegular();
     const int cutError = passing ? _file->cutTo(_end) : 0;

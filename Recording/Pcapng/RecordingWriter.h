@@ -6,8 +6,8 @@
 #include "Platform/Bytes.h"
 #include "Platform/Clock.h"
 #include "Platform/Result.h"
+#include "Recording/Files/RecordingFile.h"
 #include "Recording/Pcapng/RecordingBlocks.h"
-#include "Recording/Pcapng/RecordingFile.h"
 
 #include <cstddef>
 #include <cstdint>
@@ -19,32 +19,31 @@
 
 namespace velmora {
 
-/// Writes a recording (see RecordingBlocks.h). Messages are gathered and written as whole blocks, so that a
-/// writer that is killed leaves out the last ones and cuts at most one. Call `flush` where a reader waits on
-/// the other side, `sync` at a steady pace where the recording must outlive the machine's power.
+/// Writes a recording (see RecordingBlocks.h). Messages are buffered and written as whole blocks, so that a
+/// writer that is killed loses the last ones and cuts at most one. Call `flush` where a reader waits at the
+/// other end, `sync` at regular intervals where the recording must survive a power failure.
 ///
-/// Trouble with a regular file may pass: a full disk or quota, a limit on the file's size, a medium that
-/// fails or may not be written at the moment. It loses nothing by itself: the file is cut back to its last
-/// whole block and the messages wait, up to 32 MiB of them; only those that find no room are dropped, and all
-/// that follow, so that there is one gap and not many. Until it has passed every call gives the failure, and
-/// each `flush` and `sync` tries again. After any other failure every call gives that one and nothing more is
-/// written. `isWaiting` tells the two apart.
+/// Failures of a regular file may be temporary: a full disk or quota, a limit on the file's size, a medium
+/// that fails or is read-only at the moment. A temporary failure loses nothing by itself: the file is cut
+/// back to its last whole block and up to 32 MiB of messages are queued; once the queue is full, further
+/// messages are dropped until the failure is over, so that there is one gap and not many. Until then every
+/// call returns the failure, and each `flush` and `sync` retries. After a permanent failure every call
+/// returns it and nothing more is written. `isWaiting` says which of the two it is.
 ///
-/// Owns its file; destroying it closes it as `close` does, but tells nobody how that went. Main thread only.
+/// Owns its file; destroying it closes it as `close` does, but reports no failure. Main thread only.
 class RecordingWriter {
 public:
-    /// How much may wait for trouble to pass, in bytes of blocks.
+    /// How much is queued during a temporary failure, in bytes of blocks.
     static constexpr std::size_t maximumQueue = std::size_t{32} << 20;
-    /// How much of what is written but not known to be on the medium is kept, to be written once more when
-    /// the medium says that it failed.
+    /// How much of what is written but not yet synced is kept, to be written again when the sync fails.
     static constexpr std::size_t maximumKept = std::size_t{8} << 20;
 
     /// Creates the file, or empties it; "-" is standard output, which stays open afterwards. The file's head
-    /// is written at once. `technology` is a technology's constant or short name, of at most 255 bytes. Where
-    /// the head meets trouble that may pass there is a writer, and it is waiting.
+    /// is written at once. `technology` is a technology's constant or short name, of at most 255 bytes. If
+    /// writing the head fails temporarily, a writer is returned that is waiting.
     static Result<std::unique_ptr<RecordingWriter>> create(const std::string& path,
                                                            std::string_view technology);
-    /// Writes to an open descriptor, which it takes over; `name` is what failures call it.
+    /// Writes to an open descriptor, which it takes over; failures name it `name`.
     static Result<std::unique_ptr<RecordingWriter>> adopt(int descriptor, std::string name,
                                                           std::string_view technology);
     /// Writes to any file of which nothing has been written.
@@ -61,19 +60,18 @@ public:
     Result<Done> append(Time time, Bytes message);
     /// Hands all messages so far to the system.
     Result<Done> flush();
-    /// Flushes, and begins to have all of it put on the medium, without waiting for that: how it went is told
-    /// by a later call.
+    /// Flushes, and starts to sync the file in the background: a later call returns the result.
     Result<Done> sync();
-    /// Flushes, has the system put the file on its medium, and closes it. The second call does nothing.
+    /// Flushes, syncs and closes the file. A second call does nothing.
     Result<Done> close();
 
-    /// Messages added so far, those that wait included.
+    /// Messages added so far, queued ones included.
     [[nodiscard]] std::uint64_t messages() const { return _messages; }
-    /// Messages that found no room while trouble lasted, since the beginning.
+    /// Messages dropped during temporary failures so far.
     [[nodiscard]] std::uint64_t droppedMessages() const { return _dropped; }
     /// Messages added that are not in the file.
     [[nodiscard]] recordingBlocks::PacketCount unsaved() const;
-    /// Whether there is trouble that may pass.
+    /// Whether there is a temporary failure.
     [[nodiscard]] bool isWaiting() const { return _trouble.has_value(); }
     /// Whether messages are being dropped.
     [[nodiscard]] bool isDropping() const { return _dropping; }
@@ -83,15 +81,16 @@ private:
 
     [[nodiscard]] std::size_t written() const { return static_cast<std::size_t>(_end - _base); }
     [[nodiscard]] Bytes waiting() const { return Bytes(_buffer).subspan(written()); }
-    /// What every call gives; success while all is well.
+    /// What every call returns: the failure, or success if there is none.
     [[nodiscard]] Result<Done> outcome() const;
-    /// Whether the medium has not failed.
-    [[nodiscard]] bool takeSyncOutcome();
-    /// Has the medium take everything, and waits for it. Whether it did.
-    [[nodiscard]] bool settle();
-    /// The medium has, or has not, taken the file up to `end`.
-    [[nodiscard]] bool takeMediumsWord(int error, std::uint64_t end);
-    void stumble(const char* operation, int error);
+    /// Takes the result of the sync in the background, if it has ended. False if it failed.
+    [[nodiscard]] bool collectSync();
+    /// Syncs and waits for the result. False if it failed.
+    [[nodiscard]] bool syncNow();
+    /// Takes note that the file has been synced up to `end`, or that syncing failed. False if it failed.
+    [[nodiscard]] bool applySyncResult(int error, std::uint64_t end);
+    /// Makes the error a temporary failure where it may pass, else the permanent one.
+    void noteFailure(const char* operation, int error);
     [[nodiscard]] Failure failureOf(const char* operation, int error) const;
     /// Drops so much of the buffer's front.
     void forget(std::size_t length);
@@ -102,14 +101,14 @@ private:
     std::uint64_t _base = 0;           ///< where in the file the buffer begins
     std::uint64_t _end = 0;            ///< how long the file is
     std::uint64_t _syncing = 0;        ///< how long it was when the sync under way began
-    std::uint64_t _synced = 0;         ///< how much of it is known to be on the medium
+    std::uint64_t _synced = 0;         ///< how much of it has been synced
     bool _syncIsUnderWay = false;
     bool _keeps = false; ///< `sync` is in use
     bool _dropping = false;
     std::uint64_t _messages = 0;
     std::uint64_t _dropped = 0;
-    std::optional<Failure> _trouble; ///< may pass
-    std::optional<Failure> _failure; ///< for good
+    std::optional<Failure> _trouble; ///< temporary
+    std::optional<Failure> _failure; ///< permanent
 };
 
 } // namespace velmora

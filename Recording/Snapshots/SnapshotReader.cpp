@@ -174,7 +174,7 @@ std::optional<LoggedMessage> SnapshotReader::nextOfEntry() {
         }
         LoggedMessage message{{}, std::move(record->message), number(), record->offset};
         if (_isLog) {
-            message.time = RecordReader::timeOf(*record);
+            message.time = RecordChainReader::timeOf(*record);
             return message;
         }
         const double part = static_cast<double>(record->offset) / static_cast<double>(_size);

@@ -4,7 +4,7 @@
 #pragma once
 
 #include "PropertyLists/Value.h"
-#include "Recording/DLF/RecordReader.h"
+#include "Recording/DLF/RecordChainReader.h"
 
 #include <cstddef>
 #include <memory>
@@ -32,7 +32,7 @@ namespace velmora {
 /// A message's offset is its place in its entry's raw material, 0 for a serialized object; losses name the
 /// entry, counted from 1. Records are counted from 1 through all entries. The file is one property list and
 /// is held in memory: at most 256 MiB of it are taken. Main thread only.
-class SnapshotReader final : public RecordReader {
+class SnapshotReader final : public RecordChainReader {
 public:
     /// Opens an input of which nothing has been skipped, and reads it whole. Fails when it cannot be read, or
     /// is no snapshot.

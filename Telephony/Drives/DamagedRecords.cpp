@@ -3,6 +3,8 @@
 
 #include "Telephony/Drives/DamagedRecords.h"
 
+#include "LogMessages/LogMessage.h"
+
 #include <vector>
 
 namespace velmora {
@@ -29,14 +31,15 @@ std::optional<Data> damagedMessage(Damage damage, const DamageMaterial& material
     case Damage::BelowMinimum: return material.belowMinimum.message(moment);
     case Damage::Prefixed: {
         std::vector<std::uint8_t> bytes = bytesOf(material.good.message(moment));
-        bytes.insert(bytes.begin(), {0x81, 0x00});
+        bytes.insert(bytes.begin(), {LogMessage::prefixMarker, 0});
         return Data(std::move(bytes));
     }
     case Damage::CountOverrun:
         if (!material.overrun)
             return std::nullopt;
         return material.overrun->message(moment);
-    case Damage::UnknownCode: return RecordBuilder(0x1375, 24).u32(13, material.noise).message(moment);
+    case Damage::UnknownCode:
+        return RecordBuilder(0x1375, 24).u32(LogMessage::headerLength, material.noise).message(moment);
     }
     return std::nullopt;
 }

@@ -17,7 +17,7 @@ enum class Damage : std::uint8_t {
     CutShort,     ///< five bytes of a record: too short to be looked at
     WrongType,    ///< a type byte of 2
     BelowMinimum, ///< a well-framed record that is shorter than its section's least length
-    Prefixed,     ///< two bytes that begin 0x81 before a good record: odd, but nothing is wrong with it
+    Prefixed,     ///< a prefix before a good record: odd, but nothing is wrong with it
     CountOverrun, ///< a count byte that promises more entries than the record holds
     UnknownCode,  ///< a good record of a code that nobody subscribes to
 };

@@ -3,7 +3,7 @@
 
 #include "Telephony/Drives/RecordBuilder.h"
 
-#include "LogMessages/RecordHeader.h"
+#include "LogMessages/LogMessage.h"
 #include "LogMessages/RecordTime.h"
 
 #include <algorithm>
@@ -11,19 +11,16 @@
 
 namespace velmora {
 RecordBuilder::RecordBuilder(std::uint16_t code, std::size_t length)
-    : _bytes(std::max(length, headerLength)) {
-    u8(0, RecordHeader::basebandType);
-    u16(3, code);
-}
+    : _type(LogMessage::basebandType), _code(code), _bytes(std::max(length, LogMessage::headerLength)) {}
 
-RecordBuilder::RecordBuilder(std::uint16_t extraCode, Bytes payload) : _bytes(headerLength) {
-    u8(0, RecordHeader::extraType);
-    u16(3, extraCode);
-    _bytes.insert(_bytes.end(), payload.begin(), payload.end());
+RecordBuilder::RecordBuilder(std::uint32_t extraCode, Bytes payload)
+    : _type(LogMessage::extraType), _code(static_cast<std::uint16_t>(extraCode - LogMessage::firstExtraCode)),
+      _bytes(LogMessage::headerLength + payload.size()) {
+    std::copy_backward(payload.begin(), payload.end(), _bytes.end());
 }
 
 RecordBuilder& RecordBuilder::cutTo(std::size_t length) {
-    _bytes.resize(std::clamp(length, headerLength, _bytes.size()));
+    _bytes.resize(std::clamp(length, LogMessage::headerLength, _bytes.size()));
     return *this;
 }
 
@@ -47,12 +44,11 @@ RecordBuilder& RecordBuilder::bits(std::size_t byte, unsigned bit, unsigned widt
 }
 
 Data RecordBuilder::message(Time moment) const {
-    RecordBuilder record = *this;
-    record.u16(1, static_cast<std::int64_t>(std::min<std::size_t>(_bytes.size() - 1, 0xFFFF)));
-    const std::uint64_t timestamp = recordTimestamp(moment);
-    record.u32(5, static_cast<std::int64_t>(timestamp & 0xFFFFFFFF));
-    record.u32(9, static_cast<std::int64_t>(timestamp >> 32));
-    return Data(std::move(record._bytes));
+    const std::size_t payloadLength = _bytes.size() - LogMessage::headerLength;
+    const auto header = LogMessage::header(_type, _code, payloadLength, recordTimestamp(moment));
+    std::vector<std::uint8_t> bytes = _bytes;
+    std::copy(header.begin(), header.end(), bytes.begin());
+    return Data(std::move(bytes));
 }
 
 } // namespace velmora

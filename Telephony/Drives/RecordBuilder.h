@@ -14,15 +14,13 @@ namespace velmora {
 
 /// Lays a log record out field by field. Offsets count from the record's first byte, as the decoders' tables
 /// do, and fields are little-endian; what no field covers is zero. The record grows to hold the fields that
-/// are set. The header's length and time stamp are filled in when the message is made.
+/// are set. The header is filled in when the message is made.
 class RecordBuilder {
 public:
-    static constexpr std::size_t headerLength = 13;
-
-    /// A record of the baseband's own stream (type 1), at first of `length` bytes.
+    /// A record of the baseband's own stream, at first of `length` bytes.
     RecordBuilder(std::uint16_t code, std::size_t length);
-    /// A record of the telephony service's extra stream (type 0xFF) with this payload.
-    RecordBuilder(std::uint16_t extraCode, Bytes payload);
+    /// A record of the telephony service's extra stream with this payload; `extraCode` is one of ExtraCode's.
+    RecordBuilder(std::uint32_t extraCode, Bytes payload);
 
     /// Each stores the low bits of the value and gives the builder back.
     RecordBuilder& u8(std::size_t offset, std::int64_t value) { return store(offset, 1, value); }
@@ -38,14 +36,15 @@ public:
 
     [[nodiscard]] std::size_t size() const { return _bytes.size(); }
 
-    /// The message: the record with its length (all bytes after the type byte; a record that is too long for
-    /// the field shows the field's largest value) and this time stamp.
+    /// The message: the record with its header, of this time stamp.
     [[nodiscard]] Data message(Time moment) const;
 
 private:
     RecordBuilder& store(std::size_t offset, std::size_t width, std::int64_t value);
 
-    std::vector<std::uint8_t> _bytes;
+    std::uint8_t _type;
+    std::uint16_t _code;
+    std::vector<std::uint8_t> _bytes; ///< the header's are zero
 };
 
 } // namespace velmora

@@ -3,6 +3,7 @@
 
 #include "Telephony/Drives/ServiceRecords.h"
 
+#include "LogMessages/LogMessage.h"
 #include "Platform/TelephonyService.h"
 #include "PropertyLists/PropertyList.h"
 
@@ -13,17 +14,17 @@ namespace velmora::records {
 namespace {
 
 /// A record whose payload is that property list.
-RecordBuilder withPayload(std::uint16_t code, const Value& root, bool binary) {
+RecordBuilder withPayload(std::uint32_t extraCode, const Value& root, bool binary) {
     if (binary) {
         const auto payload = writeBinaryPropertyList(root);
         if (!payload)
             throw std::logic_error("payload cannot be written: " + payload.reason());
-        return RecordBuilder(code, Bytes(*payload));
+        return RecordBuilder(extraCode, Bytes(*payload));
     }
     const auto payload = writeXMLPropertyList(root);
     if (!payload)
         throw std::logic_error("payload cannot be written: " + payload.reason());
-    return RecordBuilder(code,
+    return RecordBuilder(extraCode,
                          Bytes(reinterpret_cast<const std::uint8_t*>(payload->data()), payload->size()));
 }
 
@@ -48,15 +49,15 @@ DictionaryRef cellCommon(std::string_view technology, const CellArea& area, bool
 } // namespace
 
 RecordBuilder simFiles(const Dictionary& files, bool binary) {
-    return withPayload(0x0000, Value(std::make_shared<Dictionary>(files)), binary);
+    return withPayload(ExtraCode::simFiles, Value(std::make_shared<Dictionary>(files)), binary);
 }
 
 RecordBuilder cellInformation(const std::vector<DictionaryRef>& cells, bool binary) {
-    return withPayload(0x0001, arrayOf(cells), binary);
+    return withPayload(ExtraCode::cellInformation, arrayOf(cells), binary);
 }
 
 RecordBuilder packetContexts(const std::vector<DictionaryRef>& contexts, bool binary) {
-    return withPayload(0x0002, arrayOf(contexts), binary);
+    return withPayload(ExtraCode::packetDataContexts, arrayOf(contexts), binary);
 }
 
 DictionaryRef gsmCellInformation(const GSMMeasurement& cell, bool serving) {

@@ -16,11 +16,11 @@
 /// otherwise; what it holds is made here, so that writing it cannot fail for reasons of the input.
 namespace velmora::records {
 
-/// 0xFF0000: the SIM's files, display-ready strings under the keys "kSimFile_...".
+/// ExtraCode::simFiles: the SIM's files, display-ready strings under the keys "kSimFile_...".
 [[nodiscard]] RecordBuilder simFiles(const Dictionary& files, bool binary);
-/// 0xFF0001: the cell information array; dictionaries made by the functions below.
+/// ExtraCode::cellInformation: the cell information array; dictionaries made by the functions below.
 [[nodiscard]] RecordBuilder cellInformation(const std::vector<DictionaryRef>& cells, bool binary);
-/// 0xFF0002: one dictionary of display strings a packet-data context.
+/// ExtraCode::packetDataContexts: one dictionary of display strings a packet-data context.
 [[nodiscard]] RecordBuilder packetContexts(const std::vector<DictionaryRef>& contexts, bool binary);
 
 /// Cells as the cell information array describes them.

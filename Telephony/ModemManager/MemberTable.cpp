@@ -12,7 +12,7 @@ namespace velmora {
 namespace {
 
 using namespace convert;
-using enum Feeds;
+using enum MemberUse;
 using Of = MemberOf;
 
 // Identities, and the largest that the air interface has.
@@ -38,10 +38,10 @@ constexpr std::string_view notShown = "no section and no bearer shows it";
 constexpr std::string_view secret = "a credential, which is no measurement and does not leave ModemManager";
 constexpr std::string_view steering = "it steers the connection and says nothing of the link";
 
-/// A member that feeds a key of a record.
-constexpr MemberRow feeds(Of of, std::string_view member, Feeds what, std::string_view key,
-                          Value (*conversion)(const Value&), std::string_view note) {
-    return {of, member, what, key, conversion, note};
+/// A member that sets a key of a record.
+constexpr MemberRow sets(Of of, std::string_view member, MemberUse use, std::string_view key,
+                         Value (*conversion)(const Value&), std::string_view note) {
+    return {of, member, use, key, conversion, note};
 }
 
 /// A member that the service itself goes by.
@@ -56,90 +56,90 @@ constexpr MemberRow unused(Of of, std::string_view member, std::string_view why)
 
 // clang-format off
 constexpr MemberRow table[] = {
-    // Where it stands, the member; then what it feeds, under which key, by which conversion, and both sides' units and
+    // Where it stands, the member; then where it is used, under which key, by which conversion, and both sides' units and
     // encodings; or what it serves for; or why it is unused.
 
     // Cells of Modem.GetCellInfo. Identities are hexadecimal text there and numbers here.
     serves(Of::AnyCell,          "cell-type",           "number; chooses the rows, and the radio access technology"),
     serves(Of::AnyCell,          "serving",             "boolean; the cell type, serving or neighbour"),
-    feeds (Of::GSMCell,          "operator-id",         Cell,        mccKey,                      countryCode,         "first three digits of \"MCCMNC\""),
-    feeds (Of::GSMCell,          "operator-id",         Cell,        mncKey,                      networkCode,         "the digits after them"),
-    feeds (Of::GSMCell,          "lac",                 Cell,        lacKey,                      areaCode,            "hexadecimal text, 16 bits"),
-    feeds (Of::GSMCell,          "ci",                  Cell,        cellIdKey,                   gsmCellId,           "hexadecimal text, 16 bits"),
-    feeds (Of::GSMCell,          "arfcn",               Cell,        kVoxCellMonitorARFCN,        arfcn,               "as it stands"),
-    feeds (Of::GSMCell,          "rx-level",            Cell,        kVoxCellMonitorRSSI,         halfStepsOfRXLEV,    "RXLEV, 1 dB up from -111 dBm, to steps of 2 dBm"),
+    sets  (Of::GSMCell,          "operator-id",         Cell,        mccKey,                      countryCode,         "first three digits of \"MCCMNC\""),
+    sets  (Of::GSMCell,          "operator-id",         Cell,        mncKey,                      networkCode,         "the digits after them"),
+    sets  (Of::GSMCell,          "lac",                 Cell,        lacKey,                      areaCode,            "hexadecimal text, 16 bits"),
+    sets  (Of::GSMCell,          "ci",                  Cell,        cellIdKey,                   gsmCellId,           "hexadecimal text, 16 bits"),
+    sets  (Of::GSMCell,          "arfcn",               Cell,        kVoxCellMonitorARFCN,        arfcn,               "as it stands"),
+    sets  (Of::GSMCell,          "rx-level",            Cell,        kVoxCellMonitorRSSI,         halfStepsOfRXLEV,    "RXLEV, 1 dB up from -111 dBm, to steps of 2 dBm"),
     unused(Of::GSMCell,          "base-station-id",     "the cell information array has no key for it"),
     unused(Of::GSMCell,          "timing-advance",      "the cell information array has no key for it"),
-    feeds (Of::UMTSCell,         "operator-id",         Cell,        mccKey,                      countryCode,         "first three digits of \"MCCMNC\""),
-    feeds (Of::UMTSCell,         "operator-id",         Cell,        mncKey,                      networkCode,         "the digits after them"),
-    feeds (Of::UMTSCell,         "lac",                 Cell,        lacKey,                      areaCode,            "hexadecimal text, 16 bits"),
-    feeds (Of::UMTSCell,         "ci",                  Cell,        cellIdKey,                   longCellId,          "hexadecimal text, 28 bits"),
-    feeds (Of::UMTSCell,         "uarfcn",              Cell,        kVoxCellMonitorUARFCN,       uarfcn,              "as it stands"),
-    feeds (Of::UMTSCell,         "psc",                 Cell,        kVoxCellMonitorSCN,          scramblingCode,      "as it stands"),
-    feeds (Of::UMTSCell,         "rscp",                Cell,        kVoxCellMonitorRSCP,         rscp,                "dBm, to the nearest whole one"),
-    feeds (Of::UMTSCell,         "ecio",                Cell,        kVoxCellMonitorECN0,         ecno,                "dB, to the nearest whole one"),
+    sets  (Of::UMTSCell,         "operator-id",         Cell,        mccKey,                      countryCode,         "first three digits of \"MCCMNC\""),
+    sets  (Of::UMTSCell,         "operator-id",         Cell,        mncKey,                      networkCode,         "the digits after them"),
+    sets  (Of::UMTSCell,         "lac",                 Cell,        lacKey,                      areaCode,            "hexadecimal text, 16 bits"),
+    sets  (Of::UMTSCell,         "ci",                  Cell,        cellIdKey,                   longCellId,          "hexadecimal text, 28 bits"),
+    sets  (Of::UMTSCell,         "uarfcn",              Cell,        kVoxCellMonitorUARFCN,       uarfcn,              "as it stands"),
+    sets  (Of::UMTSCell,         "psc",                 Cell,        kVoxCellMonitorSCN,          scramblingCode,      "as it stands"),
+    sets  (Of::UMTSCell,         "rscp",                Cell,        kVoxCellMonitorRSCP,         rscp,                "dBm, to the nearest whole one"),
+    sets  (Of::UMTSCell,         "ecio",                Cell,        kVoxCellMonitorECN0,         ecno,                "dB, to the nearest whole one"),
     unused(Of::UMTSCell,         "frequency-fdd-ul",    "the channel number says it"),
     unused(Of::UMTSCell,         "frequency-fdd-dl",    "the channel number says it"),
     unused(Of::UMTSCell,         "frequency-tdd",       "the channel number says it"),
     unused(Of::UMTSCell,         "path-loss",           "the cell information array has no key for it"),
-    feeds (Of::LTECell,          "operator-id",         Cell,        mccKey,                      countryCode,         "first three digits of \"MCCMNC\""),
-    feeds (Of::LTECell,          "operator-id",         Cell,        mncKey,                      networkCode,         "the digits after them"),
-    feeds (Of::LTECell,          "tac",                 Cell,        tacKey,                      trackingAreaCode,    "hexadecimal text, 24 bits"),
-    feeds (Of::LTECell,          "ci",                  Cell,        cellIdKey,                   longCellId,          "hexadecimal text, 28 bits"),
-    feeds (Of::LTECell,          "physical-ci",         Cell,        kVoxCellMonitorPID,          physicalCellId,      "hexadecimal text, 0 to 503"),
-    feeds (Of::LTECell,          "earfcn",              Cell,        kVoxCellMonitorUARFCN,       earfcn,              "as it stands; the downlink's"),
-    feeds (Of::LTECell,          "earfcn",              Cell,        kVoxCellMonitorBandInfo,     bandOfEARFCN,        "the band in which the downlink channel lies"),
+    sets  (Of::LTECell,          "operator-id",         Cell,        mccKey,                      countryCode,         "first three digits of \"MCCMNC\""),
+    sets  (Of::LTECell,          "operator-id",         Cell,        mncKey,                      networkCode,         "the digits after them"),
+    sets  (Of::LTECell,          "tac",                 Cell,        tacKey,                      trackingAreaCode,    "hexadecimal text, 24 bits"),
+    sets  (Of::LTECell,          "ci",                  Cell,        cellIdKey,                   longCellId,          "hexadecimal text, 28 bits"),
+    sets  (Of::LTECell,          "physical-ci",         Cell,        kVoxCellMonitorPID,          physicalCellId,      "hexadecimal text, 0 to 503"),
+    sets  (Of::LTECell,          "earfcn",              Cell,        kVoxCellMonitorUARFCN,       earfcn,              "as it stands; the downlink's"),
+    sets  (Of::LTECell,          "earfcn",              Cell,        kVoxCellMonitorBandInfo,     bandOfEARFCN,        "the band in which the downlink channel lies"),
     unused(Of::LTECell,          "rsrp",                "the array has no key for it; Signal.Lte shows the serving cell's"),
     unused(Of::LTECell,          "rsrq",                "the array has no key for it; Signal.Lte shows the serving cell's"),
     unused(Of::LTECell,          "timing-advance",      "the cell information array has no key for it"),
     unused(Of::OtherCell,        "*",                   "CDMA, TD-SCDMA and 5G NR cells are of technologies that the live display does not have"),
 
     // Modem.Location.GetLocation, source 3GPP_LAC_CI: the serving cell where GetCellInfo names none.
-    feeds (Of::CSPlace,          "mcc",                 Cell,        mccKey,                      decimalCode,         "decimal text"),
-    feeds (Of::CSPlace,          "mnc",                 Cell,        mncKey,                      decimalCode,         "decimal text"),
-    feeds (Of::CSPlace,          "lac",                 Cell,        lacKey,                      areaCode,            "hexadecimal text, 16 bits"),
-    feeds (Of::CSPlace,          "ci",                  Cell,        cellIdKey,                   longCellId,          "hexadecimal text, 28 bits"),
+    sets  (Of::CSPlace,          "mcc",                 Cell,        mccKey,                      decimalCode,         "decimal text"),
+    sets  (Of::CSPlace,          "mnc",                 Cell,        mncKey,                      decimalCode,         "decimal text"),
+    sets  (Of::CSPlace,          "lac",                 Cell,        lacKey,                      areaCode,            "hexadecimal text, 16 bits"),
+    sets  (Of::CSPlace,          "ci",                  Cell,        cellIdKey,                   longCellId,          "hexadecimal text, 28 bits"),
     unused(Of::CSPlace,          "tac",                 "GSM and UMTS have no tracking areas"),
-    feeds (Of::EPSPlace,         "mcc",                 Cell,        mccKey,                      decimalCode,         "decimal text"),
-    feeds (Of::EPSPlace,         "mnc",                 Cell,        mncKey,                      decimalCode,         "decimal text"),
-    feeds (Of::EPSPlace,         "tac",                 Cell,        tacKey,                      trackingAreaCode,    "hexadecimal text, 24 bits"),
-    feeds (Of::EPSPlace,         "ci",                  Cell,        cellIdKey,                   longCellId,          "hexadecimal text, 28 bits"),
+    sets  (Of::EPSPlace,         "mcc",                 Cell,        mccKey,                      decimalCode,         "decimal text"),
+    sets  (Of::EPSPlace,         "mnc",                 Cell,        mncKey,                      decimalCode,         "decimal text"),
+    sets  (Of::EPSPlace,         "tac",                 Cell,        tacKey,                      trackingAreaCode,    "hexadecimal text, 24 bits"),
+    sets  (Of::EPSPlace,         "ci",                  Cell,        cellIdKey,                   longCellId,          "hexadecimal text, 28 bits"),
     unused(Of::EPSPlace,         "lac",                 "it is that of the fallback for calls, not of the LTE cell"),
     unused(Of::Location,         "Capabilities",        "the answer itself tells whether there is a place"),
     unused(Of::Location,         "Enabled",             "the answer itself tells; sources that are off stay so, satellites above all"),
     unused(Of::Location,         "Location",            "empty unless signalled to everybody; GetLocation is asked"),
 
     // Modem.Signal: levels as ModemManager's own polling gives them.
-    feeds (Of::GSMSignal,        "rssi",                ServingCell, kVoxCellMonitorRSSI,         halfSteps,           "dBm to steps of 2 dBm"),
-    feeds (Of::UMTSSignal,       "rscp",                ServingCell, kVoxCellMonitorRSCP,         rscp,                "dBm, to the nearest whole one"),
-    feeds (Of::UMTSSignal,       "ecio",                ServingCell, kVoxCellMonitorECN0,         ecno,                "dB, to the nearest whole one"),
-    feeds (Of::GSMSignal,        "rssi",                Link,        "GSM RSSI",                  powerText,           "dBm"),
-    feeds (Of::GSMSignal,        "error-rate",          Link,        "GSM Bit Error Rate",        percentText,         "per cent"),
-    feeds (Of::UMTSSignal,       "rssi",                Link,        "UMTS RSSI",                 powerText,           "dBm"),
-    feeds (Of::UMTSSignal,       "rscp",                Link,        "UMTS RSCP",                 powerText,           "dBm"),
-    feeds (Of::UMTSSignal,       "ecio",                Link,        "UMTS Ec/Io",                ratioText,           "dB"),
-    feeds (Of::UMTSSignal,       "error-rate",          Link,        "UMTS Block Error Rate",     percentText,         "per cent"),
-    feeds (Of::LTESignal,        "rssi",                Link,        "LTE RSSI",                  powerText,           "dBm"),
-    feeds (Of::LTESignal,        "rsrp",                Link,        "LTE RSRP",                  powerText,           "dBm"),
-    feeds (Of::LTESignal,        "rsrq",                Link,        "LTE RSRQ",                  ratioText,           "dB"),
-    feeds (Of::LTESignal,        "snr",                 Link,        "LTE SNR",                   ratioText,           "dB"),
-    feeds (Of::LTESignal,        "error-rate",          Link,        "LTE Block Error Rate",      percentText,         "per cent"),
-    feeds (Of::NRSignal,         "rsrp",                Link,        "NR RSRP",                   powerText,           "dBm"),
-    feeds (Of::NRSignal,         "rsrq",                Link,        "NR RSRQ",                   ratioText,           "dB"),
-    feeds (Of::NRSignal,         "snr",                 Link,        "NR SNR",                    ratioText,           "dB"),
-    feeds (Of::NRSignal,         "error-rate",          Link,        "NR Block Error Rate",       percentText,         "per cent"),
+    sets  (Of::GSMSignal,        "rssi",                ServingCell, kVoxCellMonitorRSSI,         halfSteps,           "dBm to steps of 2 dBm"),
+    sets  (Of::UMTSSignal,       "rscp",                ServingCell, kVoxCellMonitorRSCP,         rscp,                "dBm, to the nearest whole one"),
+    sets  (Of::UMTSSignal,       "ecio",                ServingCell, kVoxCellMonitorECN0,         ecno,                "dB, to the nearest whole one"),
+    sets  (Of::GSMSignal,        "rssi",                Link,        "GSM RSSI",                  powerText,           "dBm"),
+    sets  (Of::GSMSignal,        "error-rate",          Link,        "GSM Bit Error Rate",        percentText,         "per cent"),
+    sets  (Of::UMTSSignal,       "rssi",                Link,        "UMTS RSSI",                 powerText,           "dBm"),
+    sets  (Of::UMTSSignal,       "rscp",                Link,        "UMTS RSCP",                 powerText,           "dBm"),
+    sets  (Of::UMTSSignal,       "ecio",                Link,        "UMTS Ec/Io",                ratioText,           "dB"),
+    sets  (Of::UMTSSignal,       "error-rate",          Link,        "UMTS Block Error Rate",     percentText,         "per cent"),
+    sets  (Of::LTESignal,        "rssi",                Link,        "LTE RSSI",                  powerText,           "dBm"),
+    sets  (Of::LTESignal,        "rsrp",                Link,        "LTE RSRP",                  powerText,           "dBm"),
+    sets  (Of::LTESignal,        "rsrq",                Link,        "LTE RSRQ",                  ratioText,           "dB"),
+    sets  (Of::LTESignal,        "snr",                 Link,        "LTE SNR",                   ratioText,           "dB"),
+    sets  (Of::LTESignal,        "error-rate",          Link,        "LTE Block Error Rate",      percentText,         "per cent"),
+    sets  (Of::NRSignal,         "rsrp",                Link,        "NR RSRP",                   powerText,           "dBm"),
+    sets  (Of::NRSignal,         "rsrq",                Link,        "NR RSRQ",                   ratioText,           "dB"),
+    sets  (Of::NRSignal,         "snr",                 Link,        "NR SNR",                    ratioText,           "dB"),
+    sets  (Of::NRSignal,         "error-rate",          Link,        "NR Block Error Rate",       percentText,         "per cent"),
     unused(Of::CDMASignal,       "*",                   "CDMA2000 is no technology of the live display"),
     serves(Of::Signal,           "Rate",                "seconds; put back as it was when nobody listens any more"),
     unused(Of::Signal,           "RssiThreshold",       "levels are polled"),
     unused(Of::Signal,           "ErrorRateThreshold",  "levels are polled"),
 
     // The modem, as part of every bearer's dictionary where it is shown.
-    feeds (Of::Modem,            "State",               Link,        "Modem State",               modemState,          "enumeration as text"),
-    feeds (Of::Modem3gpp,        "RegistrationState",   Link,        "Registration",              registrationState,   "enumeration as text"),
-    feeds (Of::Modem3gpp,        "OperatorCode",        Link,        "Operator",                  networkText,         "\"MCCMNC\" as \"MCC-MNC\""),
-    feeds (Of::Modem3gpp,        "OperatorName",        Link,        "Operator Name",             text,                "as it stands"),
-    feeds (Of::Modem,            "AccessTechnologies",  Link,        "Access Technology",         accessTechnologies,  "mask as text"),
-    feeds (Of::Modem,            "SignalQuality",       Link,        "Signal Quality",            signalQuality,       "(per cent, recent) as text"),
+    sets  (Of::Modem,            "State",               Link,        "Modem State",               modemState,          "enumeration as text"),
+    sets  (Of::Modem3gpp,        "RegistrationState",   Link,        "Registration",              registrationState,   "enumeration as text"),
+    sets  (Of::Modem3gpp,        "OperatorCode",        Link,        "Operator",                  networkText,         "\"MCCMNC\" as \"MCC-MNC\""),
+    sets  (Of::Modem3gpp,        "OperatorName",        Link,        "Operator Name",             text,                "as it stands"),
+    sets  (Of::Modem,            "AccessTechnologies",  Link,        "Access Technology",         accessTechnologies,  "mask as text"),
+    sets  (Of::Modem,            "SignalQuality",       Link,        "Signal Quality",            signalQuality,       "(per cent, recent) as text"),
     serves(Of::Modem,            "AccessTechnologies",  "mask; the log technology follows it"),
     serves(Of::Modem,            "CurrentCapabilities", "mask; the log technology of a modem that has not been on a network yet"),
     serves(Of::Modem,            "Sim",                 "path; which SIM is shown, and whether there is one"),
@@ -147,15 +147,15 @@ constexpr MemberRow table[] = {
     serves(Of::Modem3gpp,        "InitialEpsBearer",    "path; the bearer that the network gave at the attach"),
     serves(Of::Modem,            "Manufacturer",        "text, for the log"),
     serves(Of::Modem,            "Model",               "text, for the log"),
-    feeds (Of::Modem,            "OwnNumbers",          SIMFile,     "kSimFile_MSISDN",           textList,            "list of texts"),
+    sets  (Of::Modem,            "OwnNumbers",          SIMFile,     "kSimFile_MSISDN",           textList,            "list of texts"),
     unused(Of::Modem,            "StateChanged",        "a signal; the change of State that comes with it says as much"),
     unused(Of::Modem,            "EquipmentIdentifier", "the phone's identity, which no section shows"),
 
     // The SIM. ModemManager reads few of its files, and passes on what they say instead of their bytes.
-    feeds (Of::SIM,              "SimIdentifier",       SIMFile,     "kSimFile_ICCID",            digits,              "decimal digits as they stand"),
-    feeds (Of::SIM,              "OperatorIdentifier",  SIMFile,     "kSimFile_AHPLMN",           networkText,         "\"MCCMNC\" of the issuer, which is the home network, as \"MCC-MNC\""),
-    feeds (Of::SIM,              "OperatorName",        SIMFile,     "kSimFile_PNN",              text,                "the network's name as the SIM gives it"),
-    feeds (Of::SIM,              "PreferredNetworks",   SIMFile,     "kSimFile_OPLMNAcT",         preferredNetworks,   "list of (\"MCCMNC\", mask) as text"),
+    sets  (Of::SIM,              "SimIdentifier",       SIMFile,     "kSimFile_ICCID",            digits,              "decimal digits as they stand"),
+    sets  (Of::SIM,              "OperatorIdentifier",  SIMFile,     "kSimFile_AHPLMN",           networkText,         "\"MCCMNC\" of the issuer, which is the home network, as \"MCC-MNC\""),
+    sets  (Of::SIM,              "OperatorName",        SIMFile,     "kSimFile_PNN",              text,                "the network's name as the SIM gives it"),
+    sets  (Of::SIM,              "PreferredNetworks",   SIMFile,     "kSimFile_OPLMNAcT",         preferredNetworks,   "list of (\"MCCMNC\", mask) as text"),
     unused(Of::SIM,              "Imsi",                "the display has no SIM file of it, and it names the subscriber"),
     unused(Of::SIM,              "EmergencyNumbers",    "the display has no SIM file of it"),
     unused(Of::SIM,              "Gid1",                "the display has no SIM file of it"),
@@ -164,35 +164,35 @@ constexpr MemberRow table[] = {
     unused(Of::SIM,              "Active",              "the modem's Sim is the active one"),
 
     // Bearers: all is text for people.
-    feeds (Of::Bearer,           "Connected",           Bearer,      "State",                     bearerState,         "boolean as text"),
-    feeds (Of::Bearer,           "Suspended",           Bearer,      "Suspended",                 yesOrNo,             "boolean as text"),
-    feeds (Of::Bearer,           "BearerType",          Bearer,      "Type",                      bearerType,          "enumeration as text"),
-    feeds (Of::Bearer,           "ProfileId",           Bearer,      "Context ID",                numberText,          "number; below 0 there is none"),
-    feeds (Of::BearerProperties, "apn",                 Bearer,      "APN",                       text,                "as it stands"),
-    feeds (Of::BearerProperties, "ip-type",             Bearer,      "PDP Type",                  internetFamily,      "mask as text"),
-    feeds (Of::Bearer,           "Interface",           Bearer,      "Interface",                 text,                "as it stands"),
-    feeds (Of::IPv4,             "method",              Bearer,      "IPv4 Method",               configurationMethod, "enumeration as text"),
-    feeds (Of::IPv4,             "address",             Bearer,      "PDP Address",               internetAddress,     "as it stands"),
-    feeds (Of::IPv4,             "prefix",              Bearer,      "IPv4 Prefix Length",        numberText,          "bits"),
-    feeds (Of::IPv4,             "gateway",             Bearer,      "IPv4 Gateway",              internetAddress,     "as it stands"),
-    feeds (Of::IPv4,             "dns1",                Bearer,      "Primary DNS",               internetAddress,     "as it stands"),
-    feeds (Of::IPv4,             "dns2",                Bearer,      "Secondary DNS",             internetAddress,     "as it stands"),
+    sets  (Of::Bearer,           "Connected",           Bearer,      "State",                     bearerState,         "boolean as text"),
+    sets  (Of::Bearer,           "Suspended",           Bearer,      "Suspended",                 yesOrNo,             "boolean as text"),
+    sets  (Of::Bearer,           "BearerType",          Bearer,      "Type",                      bearerType,          "enumeration as text"),
+    sets  (Of::Bearer,           "ProfileId",           Bearer,      "Context ID",                numberText,          "number; below 0 there is none"),
+    sets  (Of::BearerProperties, "apn",                 Bearer,      "APN",                       text,                "as it stands"),
+    sets  (Of::BearerProperties, "ip-type",             Bearer,      "PDP Type",                  internetFamily,      "mask as text"),
+    sets  (Of::Bearer,           "Interface",           Bearer,      "Interface",                 text,                "as it stands"),
+    sets  (Of::IPv4,             "method",              Bearer,      "IPv4 Method",               configurationMethod, "enumeration as text"),
+    sets  (Of::IPv4,             "address",             Bearer,      "PDP Address",               internetAddress,     "as it stands"),
+    sets  (Of::IPv4,             "prefix",              Bearer,      "IPv4 Prefix Length",        numberText,          "bits"),
+    sets  (Of::IPv4,             "gateway",             Bearer,      "IPv4 Gateway",              internetAddress,     "as it stands"),
+    sets  (Of::IPv4,             "dns1",                Bearer,      "Primary DNS",               internetAddress,     "as it stands"),
+    sets  (Of::IPv4,             "dns2",                Bearer,      "Secondary DNS",             internetAddress,     "as it stands"),
     unused(Of::IPv4,             "dns3",                "two are as many as a context names"),
-    feeds (Of::IPv4,             "mtu",                 Bearer,      "IPv4 MTU",                  byteCount,           "bytes"),
-    feeds (Of::IPv6,             "method",              Bearer,      "IPv6 Method",               configurationMethod, "enumeration as text"),
-    feeds (Of::IPv6,             "address",             Bearer,      "PDP Address (IPv6)",        internetAddress,     "as it stands"),
-    feeds (Of::IPv6,             "prefix",              Bearer,      "IPv6 Prefix Length",        numberText,          "bits"),
-    feeds (Of::IPv6,             "gateway",             Bearer,      "IPv6 Gateway",              internetAddress,     "as it stands"),
-    feeds (Of::IPv6,             "dns1",                Bearer,      "Primary DNS (IPv6)",        internetAddress,     "as it stands"),
-    feeds (Of::IPv6,             "dns2",                Bearer,      "Secondary DNS (IPv6)",      internetAddress,     "as it stands"),
+    sets  (Of::IPv4,             "mtu",                 Bearer,      "IPv4 MTU",                  byteCount,           "bytes"),
+    sets  (Of::IPv6,             "method",              Bearer,      "IPv6 Method",               configurationMethod, "enumeration as text"),
+    sets  (Of::IPv6,             "address",             Bearer,      "PDP Address (IPv6)",        internetAddress,     "as it stands"),
+    sets  (Of::IPv6,             "prefix",              Bearer,      "IPv6 Prefix Length",        numberText,          "bits"),
+    sets  (Of::IPv6,             "gateway",             Bearer,      "IPv6 Gateway",              internetAddress,     "as it stands"),
+    sets  (Of::IPv6,             "dns1",                Bearer,      "Primary DNS (IPv6)",        internetAddress,     "as it stands"),
+    sets  (Of::IPv6,             "dns2",                Bearer,      "Secondary DNS (IPv6)",      internetAddress,     "as it stands"),
     unused(Of::IPv6,             "dns3",                "two are as many as a context names"),
-    feeds (Of::IPv6,             "mtu",                 Bearer,      "IPv6 MTU",                  byteCount,           "bytes"),
-    feeds (Of::Statistics,       "uplink-speed",        Bearer,      "Maximum Bit Rate Uplink",   bitRate,             "bit/s to kbit/s"),
-    feeds (Of::Statistics,       "downlink-speed",      Bearer,      "Maximum Bit Rate Downlink", bitRate,             "bit/s to kbit/s"),
-    feeds (Of::Statistics,       "start-date",          Bearer,      "Connected Since",           dateText,            "seconds since 1970 to date and time"),
-    feeds (Of::Statistics,       "duration",            Bearer,      "Duration",                  seconds,             "seconds"),
-    feeds (Of::Statistics,       "rx-bytes",            Bearer,      "Received",                  byteCount,           "bytes"),
-    feeds (Of::Statistics,       "tx-bytes",            Bearer,      "Sent",                      byteCount,           "bytes"),
+    sets  (Of::IPv6,             "mtu",                 Bearer,      "IPv6 MTU",                  byteCount,           "bytes"),
+    sets  (Of::Statistics,       "uplink-speed",        Bearer,      "Maximum Bit Rate Uplink",   bitRate,             "bit/s to kbit/s"),
+    sets  (Of::Statistics,       "downlink-speed",      Bearer,      "Maximum Bit Rate Downlink", bitRate,             "bit/s to kbit/s"),
+    sets  (Of::Statistics,       "start-date",          Bearer,      "Connected Since",           dateText,            "seconds since 1970 to date and time"),
+    sets  (Of::Statistics,       "duration",            Bearer,      "Duration",                  seconds,             "seconds"),
+    sets  (Of::Statistics,       "rx-bytes",            Bearer,      "Received",                  byteCount,           "bytes"),
+    sets  (Of::Statistics,       "tx-bytes",            Bearer,      "Sent",                      byteCount,           "bytes"),
     unused(Of::Statistics,       "attempts",            "of the bearer's past, not of the connection"),
     unused(Of::Statistics,       "failed-attempts",     "of the bearer's past, not of the connection"),
     unused(Of::Statistics,       "total-rx-bytes",      "of the bearer's past, not of the connection"),
@@ -216,18 +216,18 @@ std::span<const MemberRow> memberTable() {
     return table;
 }
 
-void feed(Dictionary& fed, Feeds what, MemberOf of, const Dictionary& members) {
+void setKeys(Dictionary& target, MemberUse use, MemberOf of, const Dictionary& members) {
     for (const MemberRow& row : table) {
-        if (row.of != of || row.feeds != what)
+        if (row.of != of || row.use != use)
             continue;
         if (Value value = row.convert(members[row.member]); !value.isNone())
-            fed.set(row.key, std::move(value));
+            target.set(row.key, std::move(value));
     }
 }
 
-void feed(Dictionary& fed, Feeds what, MemberOf of, const Value& members) {
+void setKeys(Dictionary& target, MemberUse use, MemberOf of, const Value& members) {
     if (const Dictionary* dictionary = members.asDictionary())
-        feed(fed, what, of, *dictionary);
+        setKeys(target, use, of, *dictionary);
 }
 
 } // namespace velmora

@@ -37,12 +37,12 @@ enum class MemberOf : std::uint8_t {
     Statistics,       ///< Stats
 };
 
-/// What a member feeds.
-enum class Feeds : std::uint8_t {
-    Cell,        ///< a cell dictionary of the cell information array (0xFF0001)
+/// What a member is used for.
+enum class MemberUse : std::uint8_t {
+    Cell,        ///< a cell dictionary of the cell information array
     ServingCell, ///< the same, of the serving cell alone, where the cell itself has no such key
-    SIMFile,     ///< the SIM's files (0xFF0000)
-    Bearer,      ///< a bearer's dictionary of display values among the packet-data contexts (0xFF0002)
+    SIMFile,     ///< the SIM's files
+    Bearer,      ///< a bearer's dictionary of display values among the packet-data contexts
     Link,        ///< every bearer's dictionary: the radio link that carries it
     Service,     ///< no record: the service itself goes by it
     Nothing,     ///< it is left unused
@@ -52,18 +52,18 @@ enum class Feeds : std::uint8_t {
 struct MemberRow {
     MemberOf of;
     std::string_view member; ///< ModemManager's name for it
-    Feeds feeds;
-    std::string_view key;           ///< the key that it feeds, where it feeds a record
-    Value (*convert)(const Value&); ///< none for what cannot be; null where it feeds no record
+    MemberUse use;
+    std::string_view key;           ///< the key that it sets, where a record has it
+    Value (*convert)(const Value&); ///< none for what cannot be; null where no record has it
     std::string_view note;          ///< the units and encodings, or what it serves, or why it is unused
 };
 
 /// The whole table.
 [[nodiscard]] std::span<const MemberRow> memberTable();
 
-/// Sets every key that the members feed, in table order; those that are missing or absurd are left out.
-/// Members that are no dictionary feed nothing.
-void feed(Dictionary& fed, Feeds what, MemberOf of, const Dictionary& members);
-void feed(Dictionary& fed, Feeds what, MemberOf of, const Value& members);
+/// Sets every key that has this use, in table order, from the members; a key whose member is missing or out
+/// of range is left out. Members that are no dictionary set nothing.
+void setKeys(Dictionary& target, MemberUse use, MemberOf of, const Dictionary& members);
+void setKeys(Dictionary& target, MemberUse use, MemberOf of, const Value& members);
 
 } // namespace velmora

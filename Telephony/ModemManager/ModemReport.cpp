@@ -49,7 +49,7 @@ DictionaryRef newCell(const RadioKind& kind, bool serving) {
 /// The levels of ModemManager's own polling, where the cell does not have its own.
 void addServingLevels(Dictionary& cell, const RadioKind& kind, const Modem& modem) {
     Dictionary levels;
-    feed(levels, Feeds::ServingCell, kind.signal, modem[mm::signal][kind.signalMember]);
+    setKeys(levels, MemberUse::ServingCell, kind.signal, modem[mm::signal][kind.signalMember]);
     for (const auto& [key, value] : levels)
         if (!cell.contains(key))
             cell.set(key, value);
@@ -70,13 +70,13 @@ Dictionary partsOf(std::string_view place) {
 }
 
 void addLink(Dictionary& context, const Modem& modem) {
-    feed(context, Feeds::Link, MemberOf::Modem3gpp, modem[mm::modem3gpp]);
-    feed(context, Feeds::Link, MemberOf::Modem, modem[mm::modem]);
+    setKeys(context, MemberUse::Link, MemberOf::Modem3gpp, modem[mm::modem3gpp]);
+    setKeys(context, MemberUse::Link, MemberOf::Modem, modem[mm::modem]);
     const Dictionary& signal = modem[mm::signal];
-    feed(context, Feeds::Link, MemberOf::GSMSignal, signal["Gsm"]);
-    feed(context, Feeds::Link, MemberOf::UMTSSignal, signal["Umts"]);
-    feed(context, Feeds::Link, MemberOf::LTESignal, signal["Lte"]);
-    feed(context, Feeds::Link, MemberOf::NRSignal, signal["Nr5g"]);
+    setKeys(context, MemberUse::Link, MemberOf::GSMSignal, signal["Gsm"]);
+    setKeys(context, MemberUse::Link, MemberOf::UMTSSignal, signal["Umts"]);
+    setKeys(context, MemberUse::Link, MemberOf::LTESignal, signal["Lte"]);
+    setKeys(context, MemberUse::Link, MemberOf::NRSignal, signal["Nr5g"]);
 }
 
 } // namespace
@@ -116,7 +116,7 @@ Dictionaries cellsOf(const Value& cellInformation, const Modem& modem) {
         if (!serving || kind == std::end(radioKinds) || cells.size() >= maximumCells)
             continue;
         const DictionaryRef cell = newCell(*kind, *serving);
-        feed(*cell, Feeds::Cell, kind->cell, *members);
+        setKeys(*cell, MemberUse::Cell, kind->cell, *members);
         if (*serving)
             addServingLevels(*cell, *kind, modem);
         cells.push_back(cell);
@@ -142,7 +142,7 @@ DictionaryRef placeOf(const Value& location, const Modem& modem) {
         if (!(bitsOf(modem, "AccessTechnologies") & kind.accessBits))
             continue;
         const DictionaryRef candidate = newCell(kind, true);
-        feed(*candidate, Feeds::Cell, kind.place, parts);
+        setKeys(*candidate, MemberUse::Cell, kind.place, parts);
         if (!candidate->contains(kVoxCellMonitorCellId))
             continue;
         addServingLevels(*candidate, kind, modem);
@@ -153,8 +153,8 @@ DictionaryRef placeOf(const Value& location, const Modem& modem) {
 
 DictionaryRef simFilesOf(const Modem& modem, const Dictionary& sim) {
     DictionaryRef files = makeDictionary();
-    feed(*files, Feeds::SIMFile, MemberOf::SIM, sim);
-    feed(*files, Feeds::SIMFile, MemberOf::Modem, modem[mm::modem]);
+    setKeys(*files, MemberUse::SIMFile, MemberOf::SIM, sim);
+    setKeys(*files, MemberUse::SIMFile, MemberOf::Modem, modem[mm::modem]);
     return files;
 }
 
@@ -164,11 +164,11 @@ Dictionaries contextsOf(const Modem& modem, const std::vector<ModemBearer>& bear
         const DictionaryRef context = makeDictionary();
         context->set("Bearer", bearer.path.substr(bearer.path.rfind('/') + 1));
         const Dictionary& properties = *bearer.properties;
-        feed(*context, Feeds::Bearer, MemberOf::Bearer, properties);
-        feed(*context, Feeds::Bearer, MemberOf::BearerProperties, properties["Properties"]);
-        feed(*context, Feeds::Bearer, MemberOf::IPv4, properties["Ip4Config"]);
-        feed(*context, Feeds::Bearer, MemberOf::IPv6, properties["Ip6Config"]);
-        feed(*context, Feeds::Bearer, MemberOf::Statistics, properties["Stats"]);
+        setKeys(*context, MemberUse::Bearer, MemberOf::Bearer, properties);
+        setKeys(*context, MemberUse::Bearer, MemberOf::BearerProperties, properties["Properties"]);
+        setKeys(*context, MemberUse::Bearer, MemberOf::IPv4, properties["Ip4Config"]);
+        setKeys(*context, MemberUse::Bearer, MemberOf::IPv6, properties["Ip6Config"]);
+        setKeys(*context, MemberUse::Bearer, MemberOf::Statistics, properties["Stats"]);
         addLink(*context, modem);
         contexts.push_back(context);
     }

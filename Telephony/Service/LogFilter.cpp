@@ -3,7 +3,7 @@
 
 #include "Telephony/Service/LogFilter.h"
 
-#include "LogMessages/RecordHeader.h"
+#include "LogMessages/LogMessage.h"
 #include "Platform/TelephonyService.h"
 
 #include <string>
@@ -56,12 +56,12 @@ Result<LogFilter> LogFilter::fromStartCommand(const Dictionary& command) {
 bool LogFilter::passes(Bytes message) const {
     if (_everything)
         return true;
-    const auto header = recordHeader(message);
+    const auto header = LogMessage::parse(message);
     if (!header)
         return true;
-    if (header->type == RecordHeader::basebandType)
+    if (header->type == LogMessage::basebandType)
         return _codes[header->code];
-    if (header->type == RecordHeader::extraType)
+    if (header->type == LogMessage::extraType)
         return _extraCodes[header->code];
     return true;
 }

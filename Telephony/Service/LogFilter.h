@@ -21,8 +21,8 @@ public:
     /// numbers from 0 to 65535.
     static Result<LogFilter> fromStartCommand(const Dictionary& command);
 
-    /// False for a well-framed record (at least 13 bytes as it arrives, of type 1 or 0xFF) whose code is in
-    /// no list. What is malformed always passes: the service does not judge it.
+    /// False for a message that LogMessage::parse takes, of either stream, whose code is in no list. What is
+    /// malformed always passes: the service does not judge it.
     [[nodiscard]] bool passes(Bytes message) const;
 
 private:

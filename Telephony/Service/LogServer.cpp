@@ -3,7 +3,7 @@
 
 #include "Telephony/Service/LogServer.h"
 
-#include "LogMessages/RecordHeader.h"
+#include "LogMessages/LogMessage.h"
 #include "Platform/SystemLog.h"
 #include "Platform/TelephonyService.h"
 #include "PropertyLists/PropertyList.h"
@@ -235,8 +235,8 @@ void LogServer::take(const Data& message) {
 }
 
 void LogServer::remember(const Data& message) {
-    const auto header = recordHeader(message.bytes());
-    if (!header || header->type != RecordHeader::extraType)
+    const auto header = LogMessage::parse(message.bytes());
+    if (!header || header->type != LogMessage::extraType)
         return;
     if (_latestExtra.size() < maximumRemembered || _latestExtra.contains(header->code))
         _latestExtra.insert_or_assign(header->code, message);

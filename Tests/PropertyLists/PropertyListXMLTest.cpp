@@ -2,7 +2,7 @@
 // SPDX-License-Identifier: MIT
 
 #include "PropertyLists/PropertyList.h"
-#include "Tests/PropertyLists/PropertyListSamples.h"
+#include "Tests/PropertyLists/XMLPropertyListText.h"
 
 #include <gtest/gtest.h>
 
@@ -14,15 +14,6 @@ namespace velmora {
 namespace {
 
 using namespace std::chrono;
-
-Result<Value> readText(std::string_view text, const PropertyListLimits& limits = {}) {
-    const auto bytes = bytesOf(text);
-    return readPropertyList(bytes, limits);
-}
-
-std::string plist(const std::string& value) {
-    return "<plist version=\"1.0\">" + value + "</plist>";
-}
 
 struct Good {
     std::string name;
@@ -239,71 +230,6 @@ TEST(XMLReader, RefusesWhatIsNotWellFormedAndSaysWhere) {
         EXPECT_TRUE(value.reason().starts_with("offset ")) << value.reason();
     }
     EXPECT_EQ(readText("<array></dict>").reason(), "offset 9: start-end tags mismatch");
-}
-
-TEST(XMLReader, HoldsToItsLimits) {
-    const auto reasonWith = [](const std::string& text, const PropertyListLimits& limits) {
-        const auto value = readText(text, limits);
-        return value ? "read" : value.reason();
-    };
-    const std::string nested = "<array><dict><key>k</key><array/></dict></array>";
-    EXPECT_EQ(reasonWith(nested, {.maximumDepth = 3}), "read");
-    EXPECT_EQ(reasonWith(nested, {.maximumDepth = 2}), "offset 25: <array> is nested deeper than 2");
-    EXPECT_EQ(reasonWith(nested, {.maximumObjects = 4}), "read");
-    EXPECT_EQ(reasonWith(nested, {.maximumObjects = 3}), "the list has more than 3 objects");
-    EXPECT_EQ(reasonWith(nested, {.maximumObjects = std::numeric_limits<std::size_t>::max()}), "read");
-    EXPECT_EQ(reasonWith("<true/>", {.maximumBytes = 7}), "read");
-    EXPECT_EQ(reasonWith("<true/>", {.maximumBytes = 6}), "the list has 7 bytes, more than 6");
-    EXPECT_EQ(reasonWith("<string>x</string>", {.maximumDepth = 0}), "read");
-}
-
-TEST(XMLReader, RefusesAMillionNestedArrays) {
-    std::string text;
-    for (int i = 0; i < 1'000'000; ++i)
-        text += "<array>";
-    const auto open = readText(text);
-    ASSERT_FALSE(open);
-    for (int i = 0; i < 1'000'000; ++i)
-        text += "</array>";
-    const auto closed = readText(text);
-    ASSERT_FALSE(closed);
-    EXPECT_EQ(closed.reason(), "offset 896: <array> is nested deeper than 128");
-}
-
-TEST(XMLReader, BoundsWhatADocumentOfTagsTakes) {
-    // Some 60 bytes of memory for every 4 of input, and attributes are no cheaper: more than the objects
-    // need.
-    std::string tags = "<string>";
-    for (int i = 0; i < 20'000; ++i)
-        tags += "<a/>";
-    std::string attributes = "<string";
-    for (int i = 0; i < 20'000; ++i)
-        attributes += " a=''";
-    for (const std::string& text : {tags + "</string>", attributes + "/>"}) {
-        const auto value = readText(text, {.maximumObjects = 100});
-        ASSERT_FALSE(value);
-        EXPECT_EQ(value.reason(), "the list has more tags and attributes than 100 objects need");
-    }
-}
-
-TEST(XMLReader, GivesAReasonOrAValueForEveryTruncationAndEveryChangedByte) {
-    const auto xml = writeXMLPropertyList(
-        arrayOf({"a & b", 12, 1.5, true, Date(), dataOf({1, 2}), dictionaryOf({{"k", makeArray()}})}));
-    ASSERT_TRUE(xml) << xml.reason();
-    for (std::size_t size = 0; size + 1 < xml->size(); ++size) {
-        const auto value = readText(std::string_view(*xml).substr(0, size));
-        ASSERT_FALSE(value) << size;
-        EXPECT_FALSE(value.reason().empty());
-    }
-    for (std::size_t i = 0; i < xml->size(); ++i)
-        for (const int flipped : {0x01, 0x02, 0x20, 0x80, 0xFF}) {
-            std::string damaged = *xml;
-            damaged[i] = static_cast<char>(damaged[i] ^ flipped);
-            const auto value = readText(damaged);
-            if (!value) {
-                EXPECT_FALSE(value.reason().empty());
-            }
-        }
 }
 
 } // namespace

@@ -6,7 +6,6 @@
 #include "Tests/Recording/LogFile.h"
 
 #include <algorithm>
-#include <memory>
 #include <string>
 #include <vector>
 
@@ -26,103 +25,6 @@ const std::string five = "1794805200000000000";
 // 1.25 ms later.
 const std::string later = "1794805200001250000";
 #define LATER "000041329B741301"
-
-struct Case {
-    const char* name;
-    const char* records;               ///< behind the version report
-    std::vector<std::string> messages; ///< less number, place and time
-};
-
-const Case cases[] = {
-    {"OfARecord",
-     R"(1000 2C51 )" FIVE R"( 04000100)", // length, code, time stamp, payload
-     {"0110002C51" FIVE "04000100"}},
-    {"OfABufferOfSeveral",
-     R"(1000 2C51 )" FIVE R"( 04000100       // the first: no type byte
-        01 0F00 3271 )" LATER R"( 010000     // the others keep theirs
-        01 1000 2C51 )" LATER R"( 05000100)",
-     {"0110002C51" FIVE "04000100", "010F003271" LATER "010000", "0110002C51" LATER "05000100"}},
-    {"OfTwoBuffers",
-     R"(1000 2C51 )" FIVE R"( 04000100
-        01 0F00 3271 )" FIVE R"( 010000
-        1000 2C51 )" LATER R"( 05000100
-        01 0F00 3271 )" LATER R"( 020000)",
-     {"0110002C51" FIVE "04000100", "010F003271" FIVE "010000", "0110002C51" LATER "05000100",
-      "010F003271" LATER "020000"}},
-    {"PrefixedInABuffer",
-     R"(1000 2C51 )" FIVE R"( 04000100
-        8171 01 0F00 3271 )" FIVE R"( 010000
-        81FF FF 0E00 0200 )" LATER R"( 3C3E)",
-     {"0110002C51" FIVE "04000100", "8171010F003271" FIVE "010000", "81FFFF0E000200" LATER "3C3E"}},
-    {"PrefixedFirstOfABuffer",
-     R"(71 01 0F00 3271 )" FIVE R"( 010000   // its 0x81 is gone
-        01 1000 2C51 )" FIVE R"( 04000100
-        01 01 0F00 3271 )" LATER R"( 010000)", // a prefix 0x81 0x01, of another buffer
-     {"8171010F003271" FIVE "010000", "0110002C51" FIVE "04000100", "8101010F003271" LATER "010000"}},
-    {"OfTheExtraStream",
-     R"(0E00 0000 )" FIVE R"( 3C3E            // codes 0 to 2 without type byte
-        1000 0100 )" FIVE R"( 62706C69
-        0C00 0200 )" LATER R"(
-        FF 0D00 0200 )" LATER R"( 3C)",
-     {"FF0E000000" FIVE "3C3E", "FF10000100" FIVE "62706C69", "FF0C000200" LATER, "FF0D000200" LATER "3C"}},
-    {"OfTheBasebandWithAnExtraCode", // told by its type byte alone
-     R"(01 0D00 0100 )" FIVE R"( AA
-        01 0F00 3271 )" FIVE R"( 010000)",
-     {"010D000100" FIVE "AA", "010F003271" FIVE "010000"}},
-    {"OfAWrongType",
-     R"(1000 2C51 )" FIVE R"( 04000100
-        02 0F00 3271 )" FIVE R"( 010000
-        01 1000 2C51 )" LATER R"( 05000100)",
-     {"0110002C51" FIVE "04000100", "020F003271" FIVE "010000", "0110002C51" LATER "05000100"}},
-    {"OfUnknownCodes",
-     R"(0F00 7513 )" FIVE R"( 010000
-        0D00 7613 )" FIVE R"( AA
-        01 0D00 7713 )" LATER R"( BB)",
-     {"010F007513" FIVE "010000", "010D007613" FIVE "AA", "010D007713" LATER "BB"}},
-    {"OfADayLater", // and a minute: 69,168,000 units of 1.25 ms
-     R"(0F00 7513 )" FIVE R"( 010000
-        0F00 7513 )" LATER R"( 020000
-        0D00 7613 0000C09DBA781301 AA
-        0D00 7713 0000C19DBA781301 BB)",
-     {"010F007513" FIVE "010000", "010F007513" LATER "020000", "010D0076130000C09DBA781301AA",
-      "010D0077130000C19DBA781301BB"}},
-    {"WithoutTimes",
-     R"(1000 2C51 0000000000000000 04000100
-        01 0F00 3271 0000000000000000 010000
-        0D00 7513 0000000000000000 AA)",
-     {"0110002C51000000000000000004000100", "010F0032710000000000000000010000",
-      "010D0075130000000000000000AA"}},
-    {"WithTimesThatAreNone", // the lower 16 bits only go up to 0xBFFF
-     R"(1000 2C51 00C040329B741301 04000100
-        0F00 3271 00C040329B741301 010000)",
-     {"0110002C5100C040329B74130104000100", "010F00327100C040329B741301010000"}},
-};
-
-std::vector<std::string> texts(const std::vector<std::string>& messages) {
-    std::vector<std::string> parts;
-    for (const std::string& message : messages)
-        parts.push_back(message.substr(message.find(": ") + 2));
-    return parts;
-}
-
-class DLFRecords : public testing::TestWithParam<Case> {};
-
-TEST_P(DLFRecords, comeAsTheyArrived) {
-    const ReadOut out = readAnyForm(joined(versionReport(), hex(GetParam().records)));
-    EXPECT_THAT(texts(out.messages), ElementsAreArray(GetParam().messages));
-    EXPECT_THAT(out.losses, IsEmpty());
-    EXPECT_EQ(out.failure, "");
-}
-
-TEST_P(DLFRecords, comeInWhateverPiecesTheyAreRead) {
-    const Data file = joined(versionReport(), hex(GetParam().records));
-    const ReadOut whole = readAnyForm(file);
-    for (const std::size_t piece : {1U, 2U, 3U, 7U, 13U})
-        EXPECT_EQ(readAnyForm(file, piece).messages, whole.messages) << piece;
-}
-
-INSTANTIATE_TEST_SUITE_P(, DLFRecords, testing::ValuesIn(cases),
-                         [](const auto& each) { return std::string(each.param.name); });
 
 TEST(DLFReader, countsTheVersionReportAsARecord) {
     const ReadOut out = readAnyForm(joined(versionReport(), bareRecord(0x512C, "05000100", stampAfter(0)),
@@ -174,21 +76,6 @@ TEST(DLFReader, stampsThatAreNoTimeStandForTheLastOne) {
     std::fill_n(timeless.begin() + 81, 4, std::uint8_t{0});
     EXPECT_THAT(timesOf(joined(Data(std::move(timeless)), zero, good)),
                 ElementsAre("315964800000000000", later));
-}
-
-TEST(DLFReader, looksAMebibyteAheadForTheTechnology) {
-    const Data nobodys = bareRecord(0x0001, std::string(120'000, '0'), stampAfter(0)); // 60012 bytes
-    const Data some = bareRecord(0x512C, "05000100", stampAfter(1));
-    const auto technologyBehind = [&](std::size_t records) {
-        Data file = versionReport();
-        std::vector<std::uint8_t> bytes(file.bytes().begin(), file.bytes().end());
-        for (std::size_t i = 0; i < records; ++i)
-            bytes.insert(bytes.end(), nobodys.bytes().begin(), nobodys.bytes().end());
-        return readAnyForm(joined(Data(std::move(bytes)), some)).technology;
-    };
-    // 17 of them are 1020221 bytes with their type bytes, 18 are above the 1048576.
-    EXPECT_EQ(technologyBehind(17), "Ostrel_GSM");
-    EXPECT_EQ(technologyBehind(18), "");
 }
 
 /// The report, then records of 16, 16, 15 and 17 bytes at 161, 177, 193, 208: the last keeps its type byte.
@@ -293,53 +180,6 @@ TEST(DLFReader, aReadErrorEndsIt) {
     EXPECT_THAT(out.losses,
                 ElementsAre("at 193, 7 bytes, record 4: 7 bytes at the end, wanted a record of 12 at least"));
     EXPECT_EQ(out.failure, "cannot read: Input/output error at offset 200");
-}
-
-/// So many records of these codes in turn.
-Data recordsOf(std::initializer_list<std::uint16_t> codes, int rounds) {
-    std::vector<std::uint8_t> bytes;
-    std::uint64_t units = 0;
-    for (int round = 0; round < rounds; ++round)
-        for (const std::uint16_t code : codes) {
-            const Data each = bareRecord(code, "0000", stampAfter(units++));
-            bytes.insert(bytes.end(), each.bytes().begin(), each.bytes().end());
-        }
-    return Data(std::move(bytes));
-}
-
-TEST(DLFReader, tellsTheTechnologyFromTheLogCodes) {
-    struct Told {
-        const char* name;
-        Data records;
-        const char* technology;
-    };
-    const Told files[] = {
-        {"each technology's own codes: GSM", recordsOf({0x512C}, 1), "Ostrel_GSM"},
-        {"LTE", recordsOf({0xB0C1}, 1), "Ostrel_LTE"},
-        {"UTRAN", recordsOf({0xD00A}, 1), "Ostrel_UTRAN2"},
-        {"CDMA", recordsOf({0x1183}, 1), "Ostrel_CDMA"},
-        {"nobody's code", recordsOf({0x1375}, 5), ""},
-        {"several technologies' codes alone", recordsOf({0x0001, 0x0002}, 5), ""},
-        {"several technologies' codes, and one's own at the end",
-         joined(recordsOf({0x0001}, 50), recordsOf({0xD0E0}, 1)), "Ostrel_UTRAN2"},
-        {"most messages decide", recordsOf({0x512C, 0xB17F, 0xB180}, 2), "Ostrel_LTE"},
-        {"as many of two", recordsOf({0x512C, 0xB17F}, 2), ""},
-        {"within 1000 messages", joined(recordsOf({0x1375}, 999), recordsOf({0xB17F}, 1)), "Ostrel_LTE"},
-        {"not behind them", joined(recordsOf({0x1375}, 1000), recordsOf({0xB17F}, 1)), ""},
-        {"three ahead is enough", joined(recordsOf({0x512C}, 3), recordsOf({0xB17F}, 100)), "Ostrel_GSM"},
-    };
-    for (const Told& each : files) {
-        auto reader = DLFReader::open(ChunkedInput(std::make_unique<MemorySource>(each.records)));
-        ASSERT_TRUE(reader) << each.name << ": " << reader.reason();
-        EXPECT_EQ((*reader)->technology(), each.technology) << each.name;
-        EXPECT_EQ((*reader)->form(), "DLF log");
-        // What was looked at comes all the same, in its order.
-        std::uint64_t number = 0;
-        while (const auto message = (*reader)->next())
-            EXPECT_EQ(message->number, ++number);
-        EXPECT_EQ(number, each.records.size() / 14) << each.name;
-        EXPECT_EQ((*reader)->technology(), each.technology) << each.name;
-    }
 }
 
 } // namespace

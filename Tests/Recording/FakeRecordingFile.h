@@ -3,7 +3,7 @@
 
 #pragma once
 
-#include "Recording/Pcapng/RecordingFile.h"
+#include "Recording/Files/RecordingFile.h"
 
 #include <algorithm>
 #include <cerrno>

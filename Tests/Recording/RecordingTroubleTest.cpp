@@ -1,13 +1,9 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Recording/Pcapng/RecordingReader.h"
-#include "Recording/Pcapng/RecordingWriter.h"
-#include "Tests/Recording/FakeRecordingFile.h"
-#include "Tests/Recording/PcapngFile.h"
+#include "Tests/Recording/RecordingTroubleFixture.h"
 
 #include <cerrno>
-#include <chrono>
 #include <string>
 #include <vector>
 
@@ -18,42 +14,7 @@ namespace {
 
 using testing::ElementsAre;
 
-constexpr std::size_t headSize = 100; // of a technology's name of 9 to 12 bytes
-constexpr std::size_t blockSize = 36; // of a message of 1 to 4 bytes
-const std::string full = "cannot write the recording: No space left on device";
-const std::string broken = "cannot write the recording: Input/output error";
-
-/// A recording on a disk that gives trouble. Each message is one byte, its number.
-class RecordingTroubleTest : public testing::Test {
-protected:
-    void start() {
-        auto started = RecordingWriter::start(std::make_unique<FakeRecordingFile>(medium), "the recording",
-                                              "Ostrel_GSM");
-        ASSERT_TRUE(started) << started.reason();
-        writer = *std::move(started);
-    }
-    Result<Done> append(std::uint8_t number) {
-        return writer->append(Time(std::chrono::nanoseconds(number)), Bytes(&number, 1));
-    }
-    /// The numbers of the messages on the disk, which must be whole.
-    [[nodiscard]] std::vector<int> numbers() const {
-        const auto reader =
-            RecordingReader::open(ChunkedInput(std::make_unique<MemorySource>(Data::copyOf(medium.content))));
-        if (!reader) {
-            ADD_FAILURE() << reader.reason();
-            return {};
-        }
-        std::vector<int> found;
-        while (const auto message = (*reader)->next())
-            found.push_back(message->message.bytes()[0]);
-        EXPECT_EQ((*reader)->lossTotals().losses, 0U);
-        return found;
-    }
-    static std::string reasonOf(const Result<Done>& result) { return result ? "success" : result.reason(); }
-
-    FakeMedium medium;
-    std::unique_ptr<RecordingWriter> writer;
-};
+using RecordingTroubleTest = RecordingTroubleFixture;
 
 TEST_F(RecordingTroubleTest, FullDiskKeepsWholeBlocksAndGoesOnWithoutAGap) {
     start();
@@ -227,82 +188,6 @@ TEST_F(RecordingTroubleTest, ShortWritesAreNoTrouble) {
     EXPECT_THAT(numbers(), ElementsAre(1, 2));
 }
 
-TEST_F(RecordingTroubleTest, SyncIsStartedForWhatIsNewAndOneAtATime) {
-    start();
-    ASSERT_TRUE(writer->sync());
-    EXPECT_EQ(medium.syncsStarted, 1U) << "the head";
-    ASSERT_TRUE(append(1));
-    ASSERT_TRUE(writer->sync());
-    EXPECT_EQ(medium.syncsStarted, 1U) << "the first is still under way";
-    EXPECT_THAT(numbers(), ElementsAre(1)) << "the file has it all the same";
-    medium.syncOutcome = 0;
-    ASSERT_TRUE(writer->sync());
-    EXPECT_EQ(medium.syncsStarted, 2U);
-    medium.syncOutcome = 0;
-    ASSERT_TRUE(writer->sync());
-    ASSERT_TRUE(writer->sync());
-    EXPECT_EQ(medium.syncsStarted, 2U) << "nothing new";
-    ASSERT_TRUE(writer->close());
-    EXPECT_EQ(medium.syncsWaitedFor, 1U);
-}
-
-TEST_F(RecordingTroubleTest, WhatTheMediumLostIsWrittenOnceMore) {
-    start();
-    ASSERT_TRUE(append(1));
-    ASSERT_TRUE(writer->sync());
-    medium.syncOutcome = 0;
-    ASSERT_TRUE(append(2));
-    ASSERT_TRUE(writer->sync());
-    ASSERT_TRUE(append(3));
-    ASSERT_TRUE(writer->flush());
-    EXPECT_THAT(numbers(), ElementsAre(1, 2, 3));
-    // The second message never reached the medium, and nobody knows of the third.
-    medium.syncOutcome = EIO;
-    EXPECT_EQ(reasonOf(writer->sync()), broken);
-    EXPECT_TRUE(writer->isWaiting());
-    EXPECT_THAT(numbers(), ElementsAre(1));
-    EXPECT_EQ(writer->unsaved().messages, 2U);
-    ASSERT_TRUE(writer->sync());
-    EXPECT_FALSE(writer->isWaiting());
-    EXPECT_EQ(medium.syncsStarted, 3U);
-    EXPECT_THAT(numbers(), ElementsAre(1, 2, 3));
-}
-
-TEST_F(RecordingTroubleTest, MediumGetsASecondTryInTheEnd) {
-    start();
-    ASSERT_TRUE(writer->sync());
-    medium.syncOutcome = 0;
-    ASSERT_TRUE(append(1));
-    ASSERT_TRUE(writer->sync());
-    medium.syncError = EIO;
-    ASSERT_TRUE(writer->close());
-    EXPECT_EQ(medium.syncsWaitedFor, 2U);
-    EXPECT_THAT(numbers(), ElementsAre(1));
-}
-
-TEST_F(RecordingTroubleTest, MediumThatFailsInTheEndIsToldWhereNothingWasKept) {
-    start();
-    ASSERT_TRUE(append(1));
-    medium.syncError = ENOSPC;
-    EXPECT_EQ(reasonOf(writer->close()), full);
-    EXPECT_EQ(medium.syncsWaitedFor, 1U);
-}
-
-TEST_F(RecordingTroubleTest, FileThatIsNotClosedIsToldUnlessThereWasTroubleBefore) {
-    start();
-    ASSERT_TRUE(append(1));
-    medium.closeError = EIO;
-    EXPECT_EQ(reasonOf(writer->close()), "cannot close the recording: Input/output error");
-    EXPECT_THAT(numbers(), ElementsAre(1));
-
-    medium = FakeMedium();
-    start();
-    ASSERT_TRUE(append(1));
-    medium.room = headSize;
-    medium.closeError = EIO;
-    EXPECT_EQ(reasonOf(writer->close()), full);
-}
-
 TEST_F(RecordingTroubleTest, LongMessageIsKeptBehindTroubleThatMayPassAndNotBehindOther) {
     // Above 128 KiB what has been gathered goes out ahead of the message.
     const std::vector<std::uint8_t> large(150'000, 2);
@@ -322,27 +207,6 @@ TEST_F(RecordingTroubleTest, LongMessageIsKeptBehindTroubleThatMayPassAndNotBehi
     ASSERT_TRUE(append(1));
     EXPECT_EQ(reasonOf(writer->append(Time(), large)), "cannot write the recording: Bad file descriptor");
     EXPECT_EQ(writer->messages(), 1U);
-}
-
-TEST_F(RecordingTroubleTest, FileSystemWithoutAMediumIsNoTrouble) {
-    start();
-    ASSERT_TRUE(append(1));
-    medium.syncError = EINVAL;
-    ASSERT_TRUE(writer->close());
-    EXPECT_THAT(numbers(), ElementsAre(1));
-}
-
-TEST_F(RecordingTroubleTest, KeepsNoMoreThanItsShareForASlowMedium) {
-    start();
-    ASSERT_TRUE(writer->sync());
-    // The medium says nothing while 9 MiB are written, one more than are kept.
-    const std::vector<std::uint8_t> large(1 << 20, 7);
-    for (int i = 0; i < 9; ++i)
-        ASSERT_TRUE(writer->append(Time(), large));
-    medium.syncOutcome = EIO;
-    EXPECT_FALSE(writer->sync());
-    ASSERT_TRUE(writer->close());
-    EXPECT_EQ(numbers().size(), 9U) << "what is kept no longer stays in the file";
 }
 
 } // namespace

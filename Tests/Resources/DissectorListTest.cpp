@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "LogMessages/RecordHeader.h"
+#include "LogMessages/LogMessage.h"
 #include "PropertyLists/PropertyList.h"
 #include "Recording/OpenMessages.h"
 #include "Tests/Recordings/ExampleRecording.h"
@@ -70,12 +70,12 @@ TEST(DissectorList, agreesOnEveryListOfTheRecordings) {
             ASSERT_LT(i, found.size());
             Bytes list = message->message.bytes();
             if (recording.scenario != "ifx") {
-                const auto header = recordHeader(list);
-                if (!header || header->type != RecordHeader::extraType) {
+                const auto header = LogMessage::parse(list);
+                if (!header || header->type != LogMessage::extraType) {
                     EXPECT_EQ(found[i], "\t\t\t");
                     continue;
                 }
-                list = header->record.subspan(RecordHeader::size);
+                list = header->payload();
             }
             const Result<Value> value = readPropertyList(list);
             ASSERT_TRUE(value) << value.reason();

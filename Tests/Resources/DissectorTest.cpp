@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "LogMessages/RecordHeader.h"
+#include "LogMessages/LogMessage.h"
 #include "LogMessages/RecordTime.h"
 #include "Recording/OpenMessages.h"
 #include "Tests/Recording/PcapngFile.h"
@@ -64,23 +64,24 @@ std::string momentText(Time moment) {
 /// tabs. A code that no decoder looks at is left out.
 std::string ourReading(const std::string& technology, Bytes message) {
     const std::string name = technology + "\t";
-    const auto header = recordHeader(message);
+    const auto header = LogMessage::parse(message);
     if (technology == "IFX")
         return name + "\t\t\t\t\t\t\t" + lowerHex(message);
     if (!header)
         return name + "\t\t\t\t\t\t\t";
     const bool anyType = technology == "Ostrel_CDMA";
-    const bool known = header->type == RecordHeader::basebandType || header->type == RecordHeader::extraType;
+    const bool known = header->type == LogMessage::basebandType || header->type == LogMessage::extraType;
     std::string sections;
     if (known)
         for (const std::string& section : sectionsWanting(technology, header->logCode()))
             sections += (sections.empty() ? "" : ";") + section;
-    const auto time = header->timestamp ? timeOfRecord(*header->timestamp) : std::nullopt;
-    const std::size_t begin = std::min(RecordHeader::size, header->record.size());
-    return name + (header->prefixed ? lowerHex(message.first(RecordHeader::prefixSize)) : "") + "\t" +
-           formatted("0x%02x", static_cast<unsigned>(header->type)) + "\t" + std::to_string(header->length) +
-           "\t" + (known || anyType ? formatted("0x%06x", static_cast<unsigned>(header->logCode())) : "") +
-           "\t" + sections + "\t" + (anyType ? recordName(header->logCode()) : "") + "\t" +
+    const auto time = header->timestamp() ? timeOfRecord(*header->timestamp()) : std::nullopt;
+    const std::size_t begin = std::min(LogMessage::headerLength, header->record.size());
+    return name + (header->prefixed ? lowerHex(message.first(LogMessage::prefixLength)) : "") + "\t" +
+           formatted("0x%02x", static_cast<unsigned>(header->type)) + "\t" +
+           std::to_string(header->length()) + "\t" +
+           (known || anyType ? formatted("0x%06x", static_cast<unsigned>(header->logCode())) : "") + "\t" +
+           sections + "\t" + (anyType ? recordName(header->logCode()) : "") + "\t" +
            (time ? momentText(*time) : "") + "\t" + lowerHex(header->record.subspan(begin));
 }
 
@@ -242,7 +243,7 @@ TEST_F(Dissector, servesDisplayFilters) {
     std::size_t sim = 0;
     std::size_t tooShort = 0;
     while (const auto message = (*reader)->next()) {
-        const auto header = recordHeader(message->message.bytes());
+        const auto header = LogMessage::parse(message->message.bytes());
         tooShort += header ? 0U : 1U;
         neighbours += header && header->logCode() == 0xB180 ? 1U : 0U;
         sim += header && header->logCode() == 0xFF0000 ? 1U : 0U;

@@ -3,6 +3,7 @@
 
 #include "Tests/Support/Hex.h"
 
+#include "LogMessages/LogMessage.h"
 #include "PropertyLists/PropertyList.h"
 
 #include <stdexcept>
@@ -21,11 +22,6 @@ int digitValue(char character) {
     if (character >= 'A' && character <= 'F')
         return character - 'A' + 10;
     return -1;
-}
-
-void appendLittleEndian16(std::vector<std::uint8_t>& bytes, std::size_t value) {
-    bytes.push_back(static_cast<std::uint8_t>(value & 0xFF));
-    bytes.push_back(static_cast<std::uint8_t>(value >> 8));
 }
 
 } // namespace
@@ -53,17 +49,12 @@ Data hex(std::string_view text) {
 }
 
 Data recordOf(std::uint16_t code, Bytes payload, std::uint8_t type) {
-    constexpr std::size_t headerAfterType = 12;
-    const std::size_t length = headerAfterType + payload.size();
+    const std::size_t length = LogMessage::headerLength - 1 + payload.size();
     if (length > 0xFFFF)
         throw std::invalid_argument("a record's length of " + std::to_string(length) +
                                     " does not fit 16 bits");
-    std::vector<std::uint8_t> bytes;
-    bytes.reserve(1 + length);
-    bytes.push_back(type);
-    appendLittleEndian16(bytes, length);
-    appendLittleEndian16(bytes, code);
-    bytes.insert(bytes.end(), 8, 0);
+    const auto header = LogMessage::header(type, code, payload.size());
+    std::vector<std::uint8_t> bytes(header.begin(), header.end());
     bytes.insert(bytes.end(), payload.begin(), payload.end());
     return Data(std::move(bytes));
 }
@@ -76,7 +67,8 @@ Data extraRecord(std::uint16_t code, const Value& plist) {
     const auto xml = writeXMLPropertyList(plist);
     if (!xml)
         throw std::invalid_argument(xml.reason());
-    return recordOf(code, Data(std::vector<std::uint8_t>(xml->begin(), xml->end())).bytes(), 0xFF);
+    return recordOf(code, Data(std::vector<std::uint8_t>(xml->begin(), xml->end())).bytes(),
+                    LogMessage::extraType);
 }
 
 Data joined(std::initializer_list<Data> parts) {

@@ -22,9 +22,8 @@ namespace velmora {
 /// for anything else, a byte of one digit included.
 [[nodiscard]] Data hex(std::string_view text);
 
-/// A log record: the type, the length (of all that follows the type, 16 bits), the log code (16 bits), eight
-/// zero bytes, then the payload, which so begins at offset 13. Numbers are little-endian. Throws
-/// std::invalid_argument where the length does not fit.
+/// A log record with a time stamp of zero (see LogMessage). Throws std::invalid_argument where the length
+/// does not fit.
 [[nodiscard]] Data recordOf(std::uint16_t code, Bytes payload, std::uint8_t type = 1);
 
 /// As `recordOf`, the payload given as `hex` takes it.
@@ -36,7 +35,7 @@ namespace velmora {
     return sys_days{year{1980} / January / 6};
 }
 
-/// A record of the telephony service's extra stream (type 0xFF) whose payload is the value as an XML property
+/// A record of the telephony service's extra stream whose payload is the value as an XML property
 /// list. Throws std::invalid_argument for a value that has no such form.
 [[nodiscard]] Data extraRecord(std::uint16_t code, const Value& plist);
 

@@ -2,7 +2,7 @@
 // SPDX-License-Identifier: MIT
 
 #include "LogGenerator/LogGenerator.h"
-#include "LogMessages/RecordHeader.h"
+#include "LogMessages/LogMessage.h"
 #include "Platform/Console.h"
 #include "Platform/DateText.h"
 #include "Platform/Linux/Files/FileResources.h"
@@ -172,8 +172,8 @@ TEST_P(RoundTripTest, DLFLogHasTheRecords) {
     // All that a log can be followed through: a whole header, and a length field that is the length.
     std::vector<Data> expected;
     for (const TimedMessage& message : _drive) {
-        const auto header = recordHeader(message.message.bytes());
-        if (header && header->record.size() >= 13 && header->length == header->record.size() - 1)
+        const auto header = LogMessage::parse(message.message.bytes());
+        if (header && header->record.size() >= 13 && header->length() == header->record.size() - 1)
             expected.push_back(message.message);
     }
     EXPECT_GT(expected.size(), _drive.size() * 9 / 10);

@@ -3,7 +3,7 @@
 
 #include "Tools/Info/RecordingSummary.h"
 
-#include "LogMessages/RecordHeader.h"
+#include "LogMessages/LogMessage.h"
 #include "Platform/DateText.h"
 #include "Tools/Text/PrintableText.h"
 
@@ -87,14 +87,14 @@ void RecordingSummary::add(const LoggedMessage& message) {
     _last = _last ? std::max(*_last, message.time) : message.time;
     if (!_binary)
         return;
-    const std::optional<RecordHeader> header = recordHeader(message.message.bytes());
+    const std::optional<LogMessage> header = LogMessage::parse(message.message.bytes());
     if (!header) {
         count(_tooShort, message);
         return;
     }
     if (header->prefixed)
         count(_prefixed, message);
-    if (header->type == RecordHeader::basebandType || header->type == RecordHeader::extraType)
+    if (header->type == LogMessage::basebandType || header->type == LogMessage::extraType)
         count(_codes[header->logCode()], message);
     else
         count(_wrongType, message);

@@ -36,7 +36,7 @@ public:
     /// The earliest and the latest time stamp; absent without messages.
     [[nodiscard]] const std::optional<Time>& first() const { return _first; }
     [[nodiscard]] const std::optional<Time>& last() const { return _last; }
-    /// By log code, 0xFF0000 added for the extra stream.
+    /// By log code, as LogMessage::logCode gives it.
     [[nodiscard]] const std::map<std::uint32_t, Count>& codes() const { return _codes; }
     /// Shorter than a header, which decoders drop.
     [[nodiscard]] const Count& tooShort() const { return _tooShort; }

@@ -43,7 +43,7 @@ TEST_F(C2KDisplayTest, onlyOddMessagesAreReported) {
     for (const ScenarioEvent& event : twentyMinutes()) {
         const CapturedLog log(LogPriority::Warning);
         decoder->updateState(state, event.message);
-        const auto header = recordHeader(event.message.bytes());
+        const auto header = LogMessage::parse(event.message.bytes());
         const bool odd =
             header && layouts.contains(header->logCode()) && (header->type == 2 || !isWellFormed(*header));
         EXPECT_EQ(!log.lines().empty(), odd) << (log.lines().empty() ? "" : log.lines()[0].text);

@@ -3,7 +3,7 @@
 
 #pragma once
 
-#include "LogMessages/RecordHeader.h"
+#include "LogMessages/LogMessage.h"
 #include "Telephony/Drives/C2K/C2KScenario.h"
 #include "Tests/Telephony/Drives/ScenarioTesting.h"
 
@@ -51,7 +51,7 @@ inline const std::map<std::uint32_t, std::function<bool(Bytes record)>> layouts 
     {0x127E, [](Bytes r) { return r.size() == 1750; }},
 };
 
-inline bool isWellFormed(const RecordHeader& header) {
+inline bool isWellFormed(const LogMessage& header) {
     const auto layout = layouts.find(header.logCode());
     return layout != layouts.end() && layout->second(header.record);
 }

@@ -36,7 +36,7 @@ TEST(C2KScenarioTest, theSameSeedGivesTheSameBytes) {
 }
 
 TEST(C2KScenarioTest, anotherSeedGivesAnotherDrive) {
-    const auto trait = [](const RecordHeader& header) -> std::optional<unsigned> {
+    const auto trait = [](const LogMessage& header) -> std::optional<unsigned> {
         if (header.logCode() != 0x134F || !isWellFormed(header))
             return std::nullopt;
         return u16(header.record, 184);
@@ -58,8 +58,8 @@ TEST(C2KScenarioTest, aboutTenMessagesComeASecond) {
 TEST(C2KScenarioTest, timeAscendsAndHeadersFollowIt) {
     expectStampsFollow(twentyMinutes());
     for (const ScenarioEvent& event : twentyMinutes())
-        if (const auto header = recordHeader(event.message.bytes())) {
-            EXPECT_EQ(header->length, header->record.size() - 1);
+        if (const auto header = LogMessage::parse(event.message.bytes())) {
+            EXPECT_EQ(header->length(), header->record.size() - 1);
             EXPECT_THAT(header->type, AnyOf(1, 2)) << "there is no extra stream";
         }
 }
@@ -71,7 +71,7 @@ TEST(C2KScenarioTest, everyKindOfOddMessageComes) {
     std::map<std::uint32_t, int> malformed;
     std::map<std::uint32_t, int> foreign;
     for (const ScenarioEvent& event : twentyMinutes()) {
-        const auto header = recordHeader(event.message.bytes());
+        const auto header = LogMessage::parse(event.message.bytes());
         if (!header) {
             EXPECT_EQ(event.message.size(), 5U);
             ++tooShort;

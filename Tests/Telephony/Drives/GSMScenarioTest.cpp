@@ -75,7 +75,7 @@ TEST(GSMScenarioTest, theSameSeedGivesTheSameBytes) {
 }
 
 TEST(GSMScenarioTest, anotherSeedGivesAnotherDrive) {
-    const auto trait = [](const RecordHeader& header) -> std::optional<unsigned> {
+    const auto trait = [](const LogMessage& header) -> std::optional<unsigned> {
         if (header.logCode() != 0x5134)
             return std::nullopt;
         return u16(header.record, 13) << 8 | header.record[15];
@@ -199,7 +199,7 @@ TEST(GSMScenarioTest, eitherRankedListComesToBeTheLatest) {
     for (const ScenarioEvent& event : tenMinutes()) {
         for (; event.offset >= tick; tick += std::chrono::seconds(2))
             ++(latestIsUMTS ? umts : gsm);
-        const auto header = recordHeader(event.message.bytes());
+        const auto header = LogMessage::parse(event.message.bytes());
         if (header && header->type == 1 && header->logCode() == 0x4005)
             latestIsUMTS = header->record[13] > 0;
     }
@@ -229,7 +229,7 @@ TEST(GSMScenarioTest, aLocationUpdateRunsInProtocolOrder) {
     // The registration after power-on: the states as they change, up to the first idle in normal service.
     std::vector<std::pair<int, int>> states;
     for (const ScenarioEvent& event : tenMinutes()) {
-        const auto header = recordHeader(event.message.bytes());
+        const auto header = LogMessage::parse(event.message.bytes());
         if (!header || header->type != 1 || header->logCode() != 0x7131 || header->record.size() < 16)
             continue;
         const std::pair<int, int> state(header->record[13], header->record[14]);
@@ -255,7 +255,7 @@ TEST(GSMScenarioTest, theDriveGoesRound) {
     int searches = 0;
     int last = -1;
     for (const ScenarioEvent& event : driveOf<GSMScenario>(1, 30min)) {
-        const auto header = recordHeader(event.message.bytes());
+        const auto header = LogMessage::parse(event.message.bytes());
         if (!header || header->type != 1 || header->logCode() != 0x7132)
             continue;
         searches += header->record[13] == 5 && last != 5;

@@ -71,7 +71,7 @@ TEST(LTEScenarioTest, theSameSeedGivesTheSameBytes) {
 }
 
 TEST(LTEScenarioTest, anotherSeedGivesAnotherDrive) {
-    const auto trait = [](const RecordHeader& header) -> std::optional<unsigned> {
+    const auto trait = [](const LogMessage& header) -> std::optional<unsigned> {
         if (header.logCode() != 0xB0C2)
             return std::nullopt;
         return u16(header.record, 14);
@@ -91,7 +91,7 @@ TEST(LTEScenarioTest, aRoundBringsEveryBandwidthAndTechnology) {
         std::set<unsigned> bandwidths;
         std::set<unsigned> types;
         for (const ScenarioEvent& event : driveOf<LTEScenario>(seed, 3min)) {
-            const auto header = recordHeader(event.message.bytes());
+            const auto header = LogMessage::parse(event.message.bytes());
             if (!header || !isGood(*header))
                 continue;
             if (header->logCode() == 0xB0C2)
@@ -205,7 +205,7 @@ TEST(LTEScenarioTest, aThirdOfTheTimeOrMoreIsConnected) {
     std::set<long> connected;
     std::set<long> idle;
     for (const ScenarioEvent& event : twentyMinutes()) {
-        const auto header = recordHeader(event.message.bytes());
+        const auto header = LogMessage::parse(event.message.bytes());
         if (!header || !isGood(*header))
             continue;
         const long second = event.offset / std::chrono::seconds(1);

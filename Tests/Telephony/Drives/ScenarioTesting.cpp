@@ -34,7 +34,7 @@ int s8(Bytes record, std::size_t offset) {
 }
 
 RecordCheck meets(const Requirements& requirements) {
-    return [&requirements](const RecordHeader& header) {
+    return [&requirements](const LogMessage& header) {
         const auto found = requirements.find(header.logCode());
         if (header.type == 2 || found == requirements.end() || header.record.size() < found->second.minimum)
             return false;
@@ -46,7 +46,7 @@ void eachRecord(const Drive& drive, std::uint32_t code, const RecordCheck& good,
                 const std::function<void(Bytes)>& look) {
     int seen = 0;
     for (const ScenarioEvent& event : drive) {
-        const auto header = recordHeader(event.message.bytes());
+        const auto header = LogMessage::parse(event.message.bytes());
         if (!header || header->logCode() != code || !good(*header))
             continue;
         ++seen;
@@ -59,10 +59,10 @@ RecordCensus censusOf(const Drive& drive, const Requirements& requirements) {
     const RecordCheck good = meets(requirements);
     RecordCensus census;
     for (const ScenarioEvent& event : drive) {
-        const auto header = recordHeader(event.message.bytes());
+        const auto header = LogMessage::parse(event.message.bytes());
         if (!header || header->type == 2)
             continue;
-        EXPECT_EQ(header->length, header->record.size() - 1);
+        EXPECT_EQ(header->length(), header->record.size() - 1);
         const auto found = requirements.find(header->logCode());
         if (found == requirements.end())
             continue;
@@ -84,7 +84,7 @@ std::size_t countOf(const std::map<std::uint32_t, std::vector<Bytes>>& records) 
 OddMessages oddMessagesOf(const Drive& drive, const RecordCheck& good, const std::set<std::uint32_t>& codes) {
     OddMessages odd;
     for (const ScenarioEvent& event : drive) {
-        const auto header = recordHeader(event.message.bytes());
+        const auto header = LogMessage::parse(event.message.bytes());
         if (!header) {
             EXPECT_EQ(event.message.size(), 5U);
             EXPECT_EQ(event.message.bytes()[0], 1);
@@ -116,8 +116,8 @@ void expectStampsFollow(const Drive& drive) {
     for (const ScenarioEvent& event : drive) {
         EXPECT_GE(event.offset, last);
         last = event.offset;
-        if (const auto header = recordHeader(event.message.bytes())) {
-            EXPECT_EQ(header->timestamp, recordTimestamp(DriveScenario::beginning() + event.offset));
+        if (const auto header = LogMessage::parse(event.message.bytes())) {
+            EXPECT_EQ(header->timestamp(), recordTimestamp(DriveScenario::beginning() + event.offset));
         }
     }
 }
@@ -131,7 +131,7 @@ void expectRate(const Drive& drive, std::chrono::seconds duration, double least,
 void expectEachCode(const Drive& drive, const std::set<std::uint32_t>& codes, const RecordCheck& good) {
     std::set<std::uint32_t> missing = codes;
     for (const ScenarioEvent& event : drive)
-        if (const auto header = recordHeader(event.message.bytes()); header && good(*header))
+        if (const auto header = LogMessage::parse(event.message.bytes()); header && good(*header))
             missing.erase(header->logCode());
     EXPECT_THAT(missing, ::testing::IsEmpty()) << "codes without a good record";
 }
@@ -139,7 +139,7 @@ void expectEachCode(const Drive& drive, const std::set<std::uint32_t>& codes, co
 void expectExtraLists(const Drive& drive, const std::function<void(unsigned code, const Value& list)>& look) {
     std::map<unsigned, std::set<bool>> binary;
     for (const ScenarioEvent& event : drive) {
-        const auto header = recordHeader(event.message.bytes());
+        const auto header = LogMessage::parse(event.message.bytes());
         if (!header || header->type != 0xFF)
             continue;
         const Bytes payload = header->record.subspan(13);
@@ -156,7 +156,7 @@ void expectExtraLists(const Drive& drive, const std::function<void(unsigned code
 std::vector<unsigned> traitsOf(const Drive& drive, const Trait& trait) {
     std::vector<unsigned> traits;
     for (const ScenarioEvent& event : drive)
-        if (const auto header = recordHeader(event.message.bytes()))
+        if (const auto header = LogMessage::parse(event.message.bytes()))
             if (const auto seen = trait(*header))
                 traits.push_back(*seen);
     return traits;

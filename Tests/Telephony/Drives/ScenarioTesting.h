@@ -3,7 +3,7 @@
 
 #pragma once
 
-#include "LogMessages/RecordHeader.h"
+#include "LogMessages/LogMessage.h"
 #include "PropertyLists/Value.h"
 #include "Telephony/Drives/Scenario.h"
 
@@ -45,7 +45,7 @@ struct Requirement {
 using Requirements = std::map<std::uint32_t, Requirement>;
 
 /// Whether a record is as its table says.
-using RecordCheck = std::function<bool(const RecordHeader&)>;
+using RecordCheck = std::function<bool(const LogMessage&)>;
 /// The same for a table of requirements, which must outlive it.
 [[nodiscard]] RecordCheck meets(const Requirements& requirements);
 
@@ -97,7 +97,7 @@ void expectEachCode(const Drive& drive, const std::set<std::uint32_t>& codes, co
 void expectExtraLists(const Drive& drive, const std::function<void(unsigned code, const Value& list)>& look);
 
 /// What tells one drive from another: of most records nothing.
-using Trait = std::function<std::optional<unsigned>(const RecordHeader&)>;
+using Trait = std::function<std::optional<unsigned>(const LogMessage&)>;
 [[nodiscard]] std::vector<unsigned> traitsOf(const Drive& drive, const Trait& trait);
 /// How many of five seeds' drives differ in that, by their first two minutes.
 template <class Kind>

@@ -60,7 +60,7 @@ TEST(UTRANScenarioTest, theSameSeedGivesTheSameBytes) {
 }
 
 TEST(UTRANScenarioTest, anotherSeedGivesAnotherDrive) {
-    const auto trait = [](const RecordHeader& header) -> std::optional<unsigned> {
+    const auto trait = [](const LogMessage& header) -> std::optional<unsigned> {
         if (header.logCode() != 0xD0E2 || header.record.size() < 26)
             return std::nullopt;
         return u16(header.record, 19) << 16 | u16(header.record, 21);
@@ -198,7 +198,7 @@ TEST(UTRANScenarioTest, anIdlePhoneRegistersWhereTheAreaChanges) {
     int changes = 0;
     auto due = std::chrono::nanoseconds::max(); // the registration, where the network does not know yet
     for (const ScenarioEvent& event : driveOf<UTRANScenario>(1, 30min)) {
-        const auto header = recordHeader(event.message.bytes());
+        const auto header = LogMessage::parse(event.message.bytes());
         if (!header || header->type != 1)
             continue;
         const Bytes r = header->record;

@@ -18,16 +18,16 @@
 namespace velmora {
 namespace {
 
-bool feedsRecord(const MemberRow& row) {
-    return row.feeds != Feeds::Service && row.feeds != Feeds::Nothing;
+bool setsKey(const MemberRow& row) {
+    return row.use != MemberUse::Service && row.use != MemberUse::Nothing;
 }
 
 TEST(MemberTableTest, everyRowIsWhole) {
     for (const MemberRow& row : memberTable()) {
         EXPECT_FALSE(row.member.empty());
         EXPECT_FALSE(row.note.empty()) << row.member << ": units, or why it is unused";
-        EXPECT_EQ(row.convert != nullptr, feedsRecord(row)) << row.member;
-        EXPECT_EQ(!row.key.empty(), feedsRecord(row)) << row.member;
+        EXPECT_EQ(row.convert != nullptr, setsKey(row)) << row.member;
+        EXPECT_EQ(!row.key.empty(), setsKey(row)) << row.member;
         if (row.convert) {
             EXPECT_TRUE(row.convert(Value()).isNone()) << row.member << ": missing is left out";
         }
@@ -38,27 +38,27 @@ TEST(MemberTableTest, noKeyOfARecordIsFedTwice) {
     // A bearer's dictionary holds its own values and the link's.
     std::set<std::string_view> bearer;
     std::set<std::string_view> files;
-    std::set<std::tuple<MemberOf, Feeds, std::string_view>> all;
+    std::set<std::tuple<MemberOf, MemberUse, std::string_view>> all;
     for (const MemberRow& row : memberTable()) {
-        if (!feedsRecord(row))
+        if (!setsKey(row))
             continue;
-        EXPECT_TRUE(all.insert({row.of, row.feeds, row.key}).second) << row.key;
-        if (row.feeds == Feeds::Bearer || row.feeds == Feeds::Link) {
+        EXPECT_TRUE(all.insert({row.of, row.use, row.key}).second) << row.key;
+        if (row.use == MemberUse::Bearer || row.use == MemberUse::Link) {
             EXPECT_TRUE(bearer.insert(row.key).second) << row.key;
-        } else if (row.feeds == Feeds::SIMFile) {
+        } else if (row.use == MemberUse::SIMFile) {
             EXPECT_TRUE(files.insert(row.key).second) << row.key;
         }
     }
 }
 
 TEST(MemberTableTest, credentialsAreNeverFed) {
-    Dictionary fed;
-    feed(fed, Feeds::Bearer, MemberOf::BearerProperties,
-         Dictionary{{"user", "me"}, {"password", "secret"}, {"apn", "a.test"}});
-    EXPECT_EQ(fed.size(), 1U);
-    EXPECT_EQ(fed["APN"], Value("a.test"));
-    feed(fed, Feeds::Bearer, MemberOf::BearerProperties, Value("no dictionary"));
-    EXPECT_EQ(fed.size(), 1U);
+    Dictionary target;
+    setKeys(target, MemberUse::Bearer, MemberOf::BearerProperties,
+            Dictionary{{"user", "me"}, {"password", "secret"}, {"apn", "a.test"}});
+    EXPECT_EQ(target.size(), 1U);
+    EXPECT_EQ(target["APN"], Value("a.test"));
+    setKeys(target, MemberUse::Bearer, MemberOf::BearerProperties, Value("no dictionary"));
+    EXPECT_EQ(target.size(), 1U);
 }
 
 /// A conversion, what it is given and what it gives.

@@ -4,7 +4,7 @@
 #include "Tests/Telephony/ModemManager/ModemManagerFixture.h"
 
 #include "LogGenerator/LogGenerator.h"
-#include "LogMessages/RecordHeader.h"
+#include "LogMessages/LogMessage.h"
 #include "LogMessages/RecordTime.h"
 #include "PropertyLists/PropertyList.h"
 #include "Tests/Support/FakeResources.h"
@@ -63,7 +63,7 @@ void ModemManagerTest::drain() {
 
 Value ModemManagerTest::latest(std::uint16_t code) const {
     for (auto message = sink.messages.rbegin(); message != sink.messages.rend(); ++message) {
-        const auto header = recordHeader(message->bytes());
+        const auto header = LogMessage::parse(message->bytes());
         if (!header || header->code != code)
             continue;
         EXPECT_EQ(header->type, 0xFF);
@@ -80,7 +80,7 @@ Value ModemManagerTest::latest(std::uint16_t code) const {
 std::size_t ModemManagerTest::count(std::uint16_t code) const {
     std::size_t records = 0;
     for (const Data& message : sink.messages)
-        if (const auto header = recordHeader(message.bytes()); header && header->code == code)
+        if (const auto header = LogMessage::parse(message.bytes()); header && header->code == code)
             ++records;
     return records;
 }

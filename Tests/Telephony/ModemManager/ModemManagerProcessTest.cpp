@@ -4,7 +4,7 @@
 #include "Tests/Telephony/ModemManager/MockModemManager.h"
 #include "Tests/Telephony/ModemManager/ModemManagerProcesses.h"
 
-#include "LogMessages/RecordHeader.h"
+#include "LogMessages/LogMessage.h"
 #include "LogMessages/RecordTime.h"
 
 #include <gmock/gmock.h>
@@ -102,9 +102,9 @@ TEST_F(ModemManagerProcessTest, aChangedTechnologyEndsTheChannelAndTheNextOneIsO
     EXPECT_EQ(client.technology(), "kVoxLogChannelTechnology_Ostrel_LTE");
     ASSERT_TRUE(client.stream());
     ASSERT_TRUE(eventually([&] { return client.messages.size() >= 3; }));
-    const auto header = recordHeader(client.messages[0].bytes());
-    ASSERT_TRUE(header && header->timestamp);
-    const auto sent = timeOfRecord(*header->timestamp);
+    const auto header = LogMessage::parse(client.messages[0].bytes());
+    ASSERT_TRUE(header && header->timestamp());
+    const auto sent = timeOfRecord(*header->timestamp());
     ASSERT_TRUE(sent);
     const auto age = std::chrono::system_clock::now() - *sent;
     EXPECT_TRUE(age > -std::chrono::seconds(1) && age < 1min) << "stamped when it was sent";

@@ -20,7 +20,7 @@ namespace velmora {
 /// more than any other's, at most over 1000 messages or 1 MiB of them, which are kept; then the one that
 /// wants most of them is it. Where two want as many, or none does, the technology stays unknown. Main thread
 /// only.
-class RecordReader : public MessageReader {
+class RecordChainReader : public MessageReader {
 public:
     static constexpr std::size_t maximumLookAhead = 1000;
     static constexpr std::size_t maximumLookAheadBytes = std::size_t{1} << 20;

@@ -1,12 +1,12 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Recording/DLF/RecordReader.h"
+#include "Recording/DLF/RecordChainReader.h"
 
 #include "LogMessages/DLFVersionReport.h"
-#include "LogMessages/FieldReader.h"
 #include "LogMessages/LogCodes.h"
-#include "LogMessages/RecordHeader.h"
+#include "LogMessages/LogMessage.h"
+#include "LogMessages/Record.h"
 #include "LogMessages/RecordTime.h"
 
 #include <algorithm>
@@ -23,7 +23,7 @@ namespace {
 class Votes {
 public:
     void add(Bytes message) {
-        const std::optional<RecordHeader> header = recordHeader(message);
+        const std::optional<LogMessage> header = LogMessage::parse(message);
         const unsigned wanted = header ? technologiesOfCode(header->logCode()) : 0;
         for (unsigned bit = 0; bit < technologyBits; ++bit)
             _votes[bit] += wanted >> bit & 1;
@@ -45,7 +45,7 @@ private:
 
 } // namespace
 
-std::optional<LoggedMessage> RecordReader::next() {
+std::optional<LoggedMessage> RecordChainReader::next() {
     if (_ahead.empty())
         return read();
     LoggedMessage message = std::move(_ahead.front());
@@ -53,7 +53,7 @@ std::optional<LoggedMessage> RecordReader::next() {
     return message;
 }
 
-void RecordReader::lookAhead() {
+void RecordChainReader::lookAhead() {
     constexpr std::size_t decisiveLead = 3;
     Votes votes;
     std::size_t bytes = 0;
@@ -70,7 +70,7 @@ void RecordReader::lookAhead() {
         _technology = votes.first();
 }
 
-std::optional<RecordChain::Record> RecordReader::nextRecord(RecordChain& chain, std::string_view place) {
+std::optional<RecordChain::Record> RecordChainReader::nextRecord(RecordChain& chain, std::string_view place) {
     for (;;) {
         std::optional<RecordChain::Record> record = chain.next();
         if (std::optional<Loss> loss = chain.takeLoss()) {
@@ -83,19 +83,18 @@ std::optional<RecordChain::Record> RecordReader::nextRecord(RecordChain& chain, 
         ++_number;
         if (!record->isVersionReport)
             return record;
-        FieldReader fields(record->message.bytes(), false);
-        // Type byte and report.
-        const std::uint32_t written = fields.u32(1 + dlfVersionReportTimeOffset);
+        // The message has a type byte before the report.
+        const std::uint32_t written = Record(record->message).u32(1 + dlfVersionReportTimeOffset);
         if (!_lastTime && written != 0)
             _lastTime = Time(std::chrono::seconds(written));
     }
 }
 
-void RecordReader::loseRecord(std::uint64_t bytes, std::string reason) {
+void RecordChainReader::loseRecord(std::uint64_t bytes, std::string reason) {
     addLoss({0, bytes, ++_number, std::move(reason), false});
 }
 
-Time RecordReader::timeOf(const RecordChain::Record& record) {
+Time RecordChainReader::timeOf(const RecordChain::Record& record) {
     const std::optional<Time> time = timeOfRecord(record.timestamp);
     if (time && record.timestamp != 0)
         _lastTime = time;

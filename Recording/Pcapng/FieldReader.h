@@ -11,8 +11,8 @@
 
 namespace velmora {
 
-/// Reads numbers of one byte order out of bytes that somebody else owns, never past their end: such a read
-/// gives 0, and `isGood` is false from then on. Ask before what was read is believed.
+/// Reads numbers of one byte order out of bytes that it does not own, never past their end: such a read
+/// returns 0, and `isGood` is false from then on. Check it before using what was read.
 class FieldReader {
 public:
     FieldReader(Bytes bytes, bool bigEndian) : _bytes(bytes), _bigEndian(bigEndian) {}

@@ -1,36 +1,18 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Tests/Telephony/ModemManager/ModemManagerFixture.h"
+#include "Tests/Telephony/ModemManager/SIMAndBearersFixture.h"
 
 #include <limits>
 
-/// The SIM's files and the packet-data contexts, from the bus to what a decoder shows.
+/// The packet-data contexts, from the bus to what a decoder shows.
 
 namespace velmora {
 namespace {
 
 using namespace std::chrono_literals;
 
-Value dictionary(std::initializer_list<Dictionary::Entry> entries) {
-    return std::make_shared<Dictionary>(entries);
-}
-
-class SIMAndBearersTest : public ModemManagerTest {
-protected:
-    void putModem(const QVariantMap& properties) {
-        mock.put(Mock::modemPath(0), testModem(lteAccess, properties));
-    }
-    static QVariant paths(const QStringList& texts) {
-        QList<QDBusObjectPath> list;
-        for (const QString& text : texts)
-            list.push_back(QDBusObjectPath(text));
-        return QVariant::fromValue(list);
-    }
-    [[nodiscard]] bool tells(std::uint16_t code, const Value& list) {
-        return passes([&] { return latest(code) == list; });
-    }
-};
+using BearersTest = SIMAndBearersFixture;
 
 /// What the link of `testModem` shows.
 constexpr std::pair<const char*, const char*> linkValues[] = {
@@ -46,87 +28,7 @@ Value context(std::initializer_list<Dictionary::Entry> entries) {
     return values;
 }
 
-TEST_F(SIMAndBearersTest, theSIMsFilesAreShown) {
-    mock.put(
-        Mock::simPath(0),
-        {{Mock::sim,
-          {{"SimIdentifier", "89011010000000000017"},
-           {"Imsi", "001010123456789"},
-           {"OperatorIdentifier", "00101"},
-           {"OperatorName", "Test Network"},
-           {"EmergencyNumbers", QStringList{"112"}},
-           {"PreferredNetworks", QVariant::fromValue(PreferredNetworks{{"00102", lteAccess},
-                                                                       {"310260", umtsAccess | gsmAccess},
-                                                                       {"99999", 0},
-                                                                       {"bad", lteAccess}})}}}});
-    putModem({{"OwnNumbers", QStringList{"+15550100", "+15550101"}}});
-    follow();
-    listen();
-    EXPECT_TRUE(
-        tells(simCode, dictionary({{"kSimFile_ICCID", "89011010000000000017"},
-                                   {"kSimFile_AHPLMN", "001-01"},
-                                   {"kSimFile_PNN", "Test Network"},
-                                   {"kSimFile_OPLMNAcT", "001-02 (LTE), 310-260 (GSM, GPRS, UMTS), 999-99"},
-                                   {"kSimFile_MSISDN", "+15550100, +15550101"}})));
-    EXPECT_EQ(at(display("LTE"), {"SIM Info"}),
-              dictionary({{"EF-ICCID", "89011010000000000017"},
-                          {"EF-MSISDN", "+15550100, +15550101"},
-                          {"EF-ACTING HPLMN", "001-01"},
-                          {"EF-PLMN NETWORK NAME", "Test Network"},
-                          {"EF-OPLMNAcT", "001-02 (LTE), 310-260 (GSM, GPRS, UMTS), 999-99"}}));
-    // What does not change is not told again.
-    queue.advance(10min);
-    drain();
-    EXPECT_EQ(count(simCode), 1U);
-    mock.change(Mock::simPath(0), Mock::sim, {{"OperatorName", "Other"}});
-    ASSERT_TRUE(passes([this] { return count(simCode) == 2; }));
-    EXPECT_EQ(at(latest(simCode), {"kSimFile_PNN"}), Value("Other"));
-}
-
-TEST_F(SIMAndBearersTest, absurdFilesAreLeftOut) {
-    const QVariant absurd[] = {
-        {},
-        5U,
-        "",
-        QString(5000, '1'),
-        QString(129, '1'),
-        QStringLiteral("8901\n1017"),
-        QStringLiteral("8901\x1b[2J"),
-        QString(QChar(0xFFFE)),
-        QStringList{"1"},
-        QVariantMap{{"1", "2"}},
-        QByteArray("1\0\xff", 3),
-        true,
-        -1.5,
-    };
-    for (const QVariant& each : absurd) {
-        QVariantMap files;
-        if (each.isValid())
-            for (const char* name :
-                 {"SimIdentifier", "OperatorIdentifier", "OperatorName", "PreferredNetworks"})
-                files[name] = each;
-        mock.put(Mock::simPath(0), {{Mock::sim, files}});
-        putModem({{"OwnNumbers", QStringList("+1")}});
-        follow();
-        listen();
-        EXPECT_TRUE(tells(simCode, dictionary({{"kSimFile_MSISDN", "+1"}}))) << each.typeName();
-        sink.messages.clear();
-        source->stop();
-    }
-    for (const QVariant& each :
-         {QVariant(5U), QVariant("5"), QVariant(QStringList{"", "\x01"}), QVariant(QVariantMap())}) {
-        putModem({{"OwnNumbers", each}});
-        follow();
-        listen();
-        queue.advance(1s);
-        drain();
-        queue.advance(1s);
-        EXPECT_EQ(count(simCode), 0U) << each.typeName();
-        source->stop();
-    }
-}
-
-TEST_F(SIMAndBearersTest, bearersAreShown) {
+TEST_F(BearersTest, bearersAreShown) {
     mock.put(
         Mock::bearerPath(0),
         {{Mock::bearer,
@@ -202,7 +104,7 @@ TEST_F(SIMAndBearersTest, bearersAreShown) {
                           context({{"Bearer", "7"}, {"State", "Connected"}, {"Type", "Default, attach"}})})));
 }
 
-TEST_F(SIMAndBearersTest, aModemWithoutBearersShowsItsLink) {
+TEST_F(BearersTest, aModemWithoutBearersShowsItsLink) {
     InterfaceMap modem = testModem(lteAccess);
     modem[Mock::signal] = {{"Rate", 1U},
                            {"Gsm", QVariantMap()},
@@ -233,7 +135,7 @@ TEST_F(SIMAndBearersTest, aModemWithoutBearersShowsItsLink) {
     EXPECT_TRUE(tells(contextCode, std::make_shared<Array>(Array{context({{"Bearer", "None"}})})));
 }
 
-TEST_F(SIMAndBearersTest, absurdLinksAndBearersAreLeftOut) {
+TEST_F(BearersTest, absurdLinksAndBearersAreLeftOut) {
     const QVariantMap bearerMembers = {
         {"Connected", 1U},
         {"Suspended", "no"},
@@ -271,7 +173,7 @@ TEST_F(SIMAndBearersTest, absurdLinksAndBearersAreLeftOut) {
                                        Array{dictionary({{"Bearer", "0"}, {"Access Technology", "LTE"}})})));
 }
 
-TEST_F(SIMAndBearersTest, manyBearersAreCut) {
+TEST_F(BearersTest, manyBearersAreCut) {
     QStringList many;
     for (int i = 0; i < 100; ++i) {
         mock.put(Mock::bearerPath(i), {{Mock::bearer, {{"Connected", false}}}});
@@ -282,28 +184,6 @@ TEST_F(SIMAndBearersTest, manyBearersAreCut) {
     listen();
     EXPECT_TRUE(passes(
         [this] { return latest(contextCode).asArray() && latest(contextCode).asArray()->size() == 8; }));
-}
-
-TEST_F(SIMAndBearersTest, partsThatCannotBeReadAreToldOnceAndTriedAgain) {
-    mock.answers["GetAll"] = {{}, "org.freedesktop.DBus.Error.AccessDenied", "hands off"};
-    putModem({{"Bearers", paths({Mock::bearerPath(0)})}});
-    mock.put(Mock::bearerPath(0), {{Mock::bearer, {{"Connected", true}}}});
-    follow();
-    listen();
-    ASSERT_TRUE(passes([this] { return mock.count("GetAll") == 6; }));
-    EXPECT_LE(std::chrono::seconds(110), clock.now() - FakeClock::defaultNow());
-    EXPECT_THAT(warnings(),
-                ::testing::IsSupersetOf({"modemmanager: no permission to ask modem 0 for its SIM "
-                                         "(org.freedesktop.DBus.Error.AccessDenied: hands off)",
-                                         "modemmanager: no permission to ask modem 0 for a bearer "
-                                         "(org.freedesktop.DBus.Error.AccessDenied: hands off)"}));
-    EXPECT_EQ(warnings().size(), 3U) << "and one of the cells";
-    EXPECT_EQ(at(latest(contextCode), {"0", "Bearer"}), Value("None"));
-    mock.answers.erase("GetAll");
-    EXPECT_TRUE(passes([this] { return at(latest(contextCode), {"0", "State"}) == Value("Connected"); }));
-    // The answers come in any order.
-    EXPECT_TRUE(
-        passes([this] { return at(latest(simCode), {"kSimFile_ICCID"}) == Value("89011010000000000017"); }));
 }
 
 } // namespace

@@ -1,0 +1,111 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
+#include "Recording/DLF/RecordCandidate.h"
+
+#include "LogMessages/DLFVersionReport.h"
+#include "LogMessages/LogCodes.h"
+#include "LogMessages/Record.h"
+#include "LogMessages/RecordTime.h"
+#include "Recording/DLF/ImpliedType.h"
+
+#include <algorithm>
+
+namespace velmora {
+
+namespace {
+
+bool isStream(std::uint8_t type) {
+    return type == LogMessage::basebandType || type == LogMessage::extraType;
+}
+
+/// What the lead says; none where the bytes do not have it.
+std::optional<int> evidenceOfLead(Bytes bytes, Lead lead, const RecordWeights& weights) {
+    if (lead == Lead::Nothing)
+        return 0;
+    const bool hasType = isStream(bytes[sizeOf(lead) - 1]);
+    switch (lead) {
+    case Lead::Prefix:
+        if (bytes[0] != LogMessage::prefixMarker)
+            return std::nullopt;
+        return weights.prefix + (hasType ? weights.type : 0);
+    case Lead::OtherType:
+        if (hasType)
+            return std::nullopt;
+        return 0;
+    default:
+        if (!hasType)
+            return std::nullopt;
+        return weights.type;
+    }
+}
+
+int evidenceOfTimestamp(std::uint64_t timestamp, std::optional<std::uint64_t> nearby,
+                        const RecordWeights& weights) {
+    constexpr std::uint64_t day = std::uint64_t{86'400} * 800; // in units of 1.25 ms
+    if (timestamp == 0)
+        return nearby.value_or(0) == 0 ? weights.zeroAmongZeros : weights.zeroAmongTimes;
+    if (!isRecordTime(timestamp))
+        return weights.badTimestamp;
+    if (nearby.value_or(0) == 0)
+        return 0;
+    const auto [less, more] = std::minmax({timestamp >> 16, *nearby >> 16}); // by value: both are temporaries
+    return more - less <= day ? weights.nearTimestamp : weights.farTimestamp;
+}
+
+} // namespace
+
+std::size_t sizeOf(Lead lead) {
+    switch (lead) {
+    case Lead::Nothing: return 0;
+    case Lead::Type:
+    case Lead::OtherType: return 1;
+    case Lead::CutPrefix: return LogMessage::prefixLength;
+    case Lead::Prefix: return LogMessage::prefixLength + 1;
+    }
+    return 0;
+}
+
+std::optional<RecordCandidate> RecordCandidate::read(Bytes bytes, Lead lead,
+                                                     std::optional<std::uint64_t> nearby,
+                                                     const RecordWeights& weights) {
+    const std::size_t leadSize = sizeOf(lead);
+    if (bytes.size() < leadSize + bareHeaderLength)
+        return std::nullopt;
+    const std::optional<int> leadEvidence = evidenceOfLead(bytes, lead, weights);
+    if (!leadEvidence)
+        return std::nullopt;
+    const Record header(bytes.subspan(leadSize, bareHeaderLength));
+    constexpr std::size_t typeSize = 1; // which LogMessage's offsets count and the bare header lacks
+    RecordCandidate candidate;
+    candidate.lead = lead;
+    candidate.length = header.u16(LogMessage::lengthOffset - typeSize);
+    if (candidate.length < bareHeaderLength)
+        return std::nullopt;
+    candidate.size = leadSize + candidate.length;
+    candidate.code = header.u16(LogMessage::codeOffset - typeSize);
+    candidate.timestamp = header.u64(LogMessage::timestampOffset - typeSize);
+    candidate.evidence = *leadEvidence + evidenceOfTimestamp(candidate.timestamp, nearby, weights);
+    const bool isExtra = leadSize != 0 && bytes[leadSize - 1] == LogMessage::extraType;
+    const std::uint32_t logCode = (isExtra ? LogMessage::firstExtraCode : 0) + candidate.code;
+    if (candidate.isVersionReport())
+        candidate.evidence += weights.versionReport;
+    // Zeros that count as no time do not count as a code of the extra stream besides.
+    else if (technologiesOfCode(logCode) != 0 && (candidate.code | candidate.timestamp) != 0)
+        candidate.evidence += weights.wantedCode;
+    return candidate;
+}
+
+bool RecordCandidate::isVersionReport() const {
+    return lead == Lead::Nothing && code == dlfVersionReportCode && length == dlfVersionReportSize;
+}
+
+std::optional<std::uint8_t> RecordCandidate::missingByte() const {
+    switch (lead) {
+    case Lead::Nothing: return impliedType(code);
+    case Lead::CutPrefix: return LogMessage::prefixMarker;
+    default: return std::nullopt;
+    }
+}
+
+} // namespace velmora
