@@ -90,12 +90,12 @@ private:
     static void compare(DecoderSession& busy, const DecoderMaker& maker, const Data& message) {
         DecoderSession fresh(maker);
         fresh.redraw(); // builds the display
-        markLists(fresh.state()["Display"]);
-        const Value before = fresh.state()["Display"].copy();
+        markLists(fresh.display());
+        const Value before = fresh.display().copy();
         const bool freshLives = fresh.update(message);
         require(busy.update(message) == freshLives, "the same records end the program");
         if (freshLives)
-            expectSameWhereWritten(before, fresh.state()["Display"], busy.state()["Display"]);
+            expectSameWhereWritten(before, fresh.display(), busy.display());
     }
 
     ShippedTemplates _templates;

@@ -6,22 +6,10 @@
 #include "LogGenerator/ArrayLock.h"
 #include "Platform/SystemLog.h"
 
+#include <algorithm>
 #include <iterator>
-#include <utility>
 
 namespace velmora {
-
-namespace {
-
-/// One row for each of the entries, which stand side by side and are as long as their layout.
-void appendRows(Array& elements, Bytes entries, const Layout& layout) {
-    const CountedList list(Record(entries), 0, layout.minimumLength, entries.size() / layout.minimumLength);
-    elements.reserve(list.count());
-    for (std::size_t i = 0; i < list.count(); ++i)
-        writeFields(elements.appendRow(), list[i], layout);
-}
-
-} // namespace
 
 Base* Base::initWithDict(ClassDictionary& classDict, CodeDictionary& codeDict) {
     classDict.insert_or_assign(std::string(getSectionName()), this);
@@ -29,23 +17,114 @@ Base* Base::initWithDict(ClassDictionary& classDict, CodeDictionary& codeDict) {
     return this;
 }
 
+std::vector<std::uint32_t> Base::getLogCodeArray() const {
+    std::vector<std::uint32_t> codes;
+    for (const View& view : views())
+        codes.push_back(view.code);
+    return codes;
+}
+
 void Base::updateSectionRef(const Value& node) {
+    writeNode();
     _dictionaryRef.refer(node.dictionaryRef());
     _arrayRef.refer(node.arrayRef());
+    _views = views();
+    _records.clear();
+    _records.resize(_views.size());
     logLine(LogPriority::Warning, getSectionName());
 }
 
-Value Base::node() const {
+Value Base::node() {
+    writeNode();
     if (DictionaryRef dictionary = _dictionaryRef.share())
         return dictionary;
     return _arrayRef.share();
 }
 
 void Base::updateLogCodeDict(CodeDictionary& codeDict) {
-    const std::vector<std::uint32_t> codes = getLogCodeArray();
-    logFormat(LogPriority::Warning, "Array Count: %d", static_cast<int>(codes.size()));
-    for (const std::uint32_t code : codes)
-        codeDict[std::to_string(code)].push_back(this);
+    logFormat(LogPriority::Warning, "Array Count: %d", static_cast<int>(views().size()));
+    for (const View& view : views())
+        codeDict[std::to_string(view.code)].push_back(this);
+}
+
+void Base::updateWithData(const Data& data, std::uint32_t logCode) {
+    trace();
+    const View* const view = viewOf(logCode);
+    if (!view) {
+        unknownCode(logCode);
+        return;
+    }
+    const Record record(data);
+    if (record.size() < view->minimumLength)
+        return;
+    check(*view, record);
+    keep(*view, record.part(0, neededLength(*view, record)), partsOf(*view, record));
+}
+
+void Base::decode(const View& view, const Record& record, FieldVisitor& visitor) const {
+    if (view.table)
+        visitor.fields(record, *view.table);
+}
+
+void Base::trace() const {
+    logLine(LogPriority::Warning, getSectionName());
+}
+
+void Base::unknownCode(std::uint32_t logCode) const {
+    unknownLogMessage(logCode);
+}
+
+void Base::check(const View&, const Record&) const {}
+
+std::size_t Base::neededLength(const View& view, const Record& record) const {
+    return view.table ? view.minimumLength : record.size();
+}
+
+KeptRecords::Parts Base::partsOf(const View&, const Record&) const {
+    return 1;
+}
+
+const View* Base::viewOf(std::uint32_t logCode) const {
+    const std::span<const View> all = views();
+    const auto found =
+        std::find_if(all.begin(), all.end(), [logCode](const View& view) { return view.code == logCode; });
+    return found == all.end() ? nullptr : &*found;
+}
+
+bool Base::prepareFor(const View& view, KeptRecords::Parts parts) {
+    if (_arrayRef.get())
+        _records.dropAllBut(indexOf(view)); // a list is replaced as a whole
+    else if (!_dictionaryRef.get())
+        return false;
+    if (_records.wouldLose(indexOf(view), parts))
+        writeNode();
+    return true;
+}
+
+void Base::keepPrepared(const View& view, const Record& record, KeptRecords::Parts parts) {
+    if (_records.keep(indexOf(view), record.bytes(), parts))
+        writeNode();
+}
+
+void Base::writeNode() {
+    if (Array* const list = _arrayRef.get()) {
+        writeInto(*list);
+    } else if (Dictionary* const node = _dictionaryRef.get()) {
+        _records.writeAll([this, node](std::size_t view, Bytes bytes) {
+            DisplayWriter writer(*node, _spareRows);
+            decode(_views[view], Record(bytes), writer);
+        });
+    } else {
+        _records.clear();
+    }
+}
+
+void Base::writeInto(Array& node) {
+    _records.writeAll([this, &node](std::size_t view, Bytes bytes) {
+        const ArrayLock::Guard guard;
+        DisplayWriter writer(node, _spareRows);
+        decode(_views[view], Record(bytes), writer);
+    });
 }
 
 void Base::clearElementsInArray(Array& array) {
@@ -78,78 +157,15 @@ std::int16_t Base::lookUpECNO(std::uint32_t value) {
     return 0; // as for 0 dB and above, on purpose
 }
 
-void Base::setText(std::string_view label, std::string_view text) const {
-    if (Dictionary* const node = dictionary())
-        node->setText(label, text);
-}
-
-bool Base::show(const Record& record, const Layout& layout) const {
-    if (record.size() < layout.minimumLength)
-        return false;
-    if (Dictionary* const node = dictionary())
-        writeFieldsLater(*node, record, layout);
-    return true;
-}
-
-void Base::showList(const ListField& field, const CountedList& list, std::uint32_t logCode) const {
-    constexpr auto write = [](Dictionary& node, Bytes bytes, const void* table) {
-        const auto& wanted = *static_cast<const ListField*>(table);
-        const ArrayRef entries = makeArray();
-        appendRows(*entries, bytes, wanted.entry);
-        node.set(wanted.label, entries);
-    };
-    reportMissingEntries(list, logCode);
-    if (Dictionary* const node = dictionary())
-        node->writeLater({write, &field}, list.entries().bytes());
-}
-
-Array Base::rows(const CountedList& list, const Layout& layout, std::uint32_t logCode) {
-    reportMissingEntries(list, logCode);
-    Array result;
-    appendRows(result, list.entries().bytes(), layout);
-    return result;
-}
-
 void Base::reportMissingEntries(const CountedList& list, std::uint32_t logCode) {
-    reportMissingEntries(list.whole(), list.count(), logCode);
+    if (!list.isWhole())
+        reportMissingEntries(list.whole(), list.count(), logCode);
 }
 
 void Base::reportMissingEntries(std::size_t whole, std::size_t count, std::uint32_t logCode) {
     if (whole < count)
         logFormat(LogPriority::Error, "Record 0x%04X: %d of %d entries", logCode, static_cast<int>(whole),
                   static_cast<int>(count));
-}
-
-void Base::clearElements() const {
-    if (Array* const node = array())
-        clearElementsInArray(*node);
-}
-
-void Base::replaceElements(const Array& newElements) const {
-    if (Array* const node = array())
-        replaceArray(*node, newElements);
-}
-
-void Base::showRows(const CountedList& list, const Layout& layout, std::uint32_t logCode) const {
-    constexpr auto write = [](Array& elements, Bytes bytes, const void* table) {
-        appendRows(elements, bytes, *static_cast<const Layout*>(table));
-    };
-    reportMissingEntries(list, logCode);
-    replaceElementsLater({write, &layout}, list.entries());
-}
-
-void Base::replaceElementsLater(const Writing<Array>& writing, const Record& record) const {
-    if (Array* const node = array()) {
-        ArrayLock::Guard guard;
-        node->writeLater(writing, record.bytes());
-    }
-}
-
-const std::vector<Cell>* Base::cellsOf(const Data& record) const {
-    const std::vector<Cell>* cells = readCells(record);
-    if (!cells)
-        logLine(LogPriority::Error, "Failed to get Cell Array\n");
-    return cells;
 }
 
 void Base::unknownLogMessage(std::uint32_t logCode) {

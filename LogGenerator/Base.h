@@ -3,15 +3,17 @@
 
 #pragma once
 
-#include "LogGenerator/Extra/CellList.h"
-#include "LogGenerator/Fields/Field.h"
-#include "LogMessages/Record.h"
+#include "LogGenerator/Fields/DisplayWriter.h"
+#include "LogGenerator/Fields/FieldVisitor.h"
+#include "LogGenerator/KeptRecords.h"
+#include "LogGenerator/View.h"
 #include "PropertyLists/Value.h"
 
 #include <cstdint>
 #include <functional>
 #include <map>
 #include <memory>
+#include <span>
 #include <string>
 #include <string_view>
 #include <vector>
@@ -25,22 +27,12 @@ using ClassDictionary = std::map<std::string, Base*, std::less<>>;
 /// Log code as a decimal string ("53472") to the sections that want it, in the order of their registration.
 using CodeDictionary = std::map<std::string, std::vector<Base*>, std::less<>>;
 
-/// The extra stream's codes start here: 0xFF0000 plus the 16-bit code of the record.
-inline constexpr std::uint32_t firstExtraCode = 0xFF0000;
-
-/// A list that stands as a value in a section's dictionary: its label, and the table of its entries.
-struct ListField {
-    std::string_view label;
-    Layout entry;
-};
-
-/// A section: one block of the measurement screen. It names itself, lists the log codes that it wants, and
-/// writes display strings straight into its node of the display dictionary when one of their records arrives.
-/// The node is owned by the display; the section only refers to it. Main thread only.
+/// A section: one block of the measurement screen. It names itself, says by its views which log codes it
+/// wants, and what it shows of a record is one function, `decode`, which names the fields to a visitor. Its
+/// node of the display dictionary is owned by the display; the section only refers to it. Main thread only.
 ///
-/// What a section shows by its tables is handed to the node as bytes and becomes text when the node is looked
-/// at (see Writing); errors in the record are found and told when it arrives. So the tables and functions
-/// that are given to show... must be constants.
+/// On arrival a record is checked, and what is wrong with it is logged. Its fields are written when the
+/// generator hands the display out (`writeNode`) or when the node is asked for; see KeptRecords.
 class Base {
 public:
     virtual ~Base() = default;
@@ -53,22 +45,26 @@ public:
 
     /// The section's display name, which is also the key of its node in the display template.
     [[nodiscard]] virtual std::string_view getSectionName() const = 0;
-    /// The codes that the section wants, in the order in which they are registered; none for a section that
-    /// is only there to be shown.
-    [[nodiscard]] virtual std::vector<std::uint32_t> getLogCodeArray() const = 0;
-    /// Decodes one record (without the optional prefix) that was routed here under `logCode`. What is
+    /// What the section reads, a constant; empty for a section that is only there to be shown.
+    [[nodiscard]] virtual std::span<const View> views() const = 0;
+    /// The codes of the views, in their order.
+    [[nodiscard]] std::vector<std::uint32_t> getLogCodeArray() const;
+    /// Takes one record (without the optional prefix) that was routed here under `logCode`. What is
     /// malformed is logged and dropped, and the node keeps its earlier values.
-    virtual void updateWithData(const Data& data, std::uint32_t logCode) = 0;
+    virtual void updateWithData(const Data& data, std::uint32_t logCode);
+
+    /// Names the fields of a record of the view to the visitor, in the order in which they are shown.
+    /// Precondition: the record was accepted by `updateWithData`. Not overriding it names the view's table.
+    virtual void decode(const View& view, const Record& record, FieldVisitor& visitor) const;
 
     /// Hands the section its node, a dictionary or an array.
     void updateSectionRef(const Value& node);
-    /// The node; none before the display is built and once it is gone.
-    [[nodiscard]] Value node() const;
+    /// The node with all that has arrived; none before the display is built and once it is gone.
+    [[nodiscard]] Value node();
+    /// Writes what has arrived and is not in the node yet.
+    void writeNode();
     /// Appends this section to the subscribers of each of its codes: a code listed twice is subscribed twice.
     void updateLogCodeDict(CodeDictionary& codeDict);
-
-    /// Has the section read the cell information array together with others.
-    void shareCellList(std::shared_ptr<CellList> cells) { _cells = std::move(cells); }
 
     /// Both rewrite the array under `ArrayLock`; the array object stays the same, so that the display keeps
     /// pointing at it.
@@ -83,69 +79,55 @@ public:
 protected:
     Base() = default;
 
-    /// The node, null before the display is built and where it is of the other kind. A value written to no
-    /// node goes nowhere.
-    [[nodiscard]] Dictionary* dictionary() const { return _dictionaryRef.get(); }
-    [[nodiscard]] Array* array() const { return _arrayRef.get(); }
+    /// The line that each record gives, whatever becomes of it: the section's name at warning priority.
+    virtual void trace() const;
+    /// A record under a code that no view has: an error line.
+    virtual void unknownCode(std::uint32_t logCode) const;
+    /// Logs what an accepted record lacks, once, on arrival. Not overriding it logs nothing.
+    virtual void check(const View& view, const Record& record) const;
+    /// How much of an accepted record `decode` reads; the rest is not kept. Not overriding it says what the
+    /// view's table reads, or all of it.
+    [[nodiscard]] virtual std::size_t neededLength(const View& view, const Record& record) const;
+    /// The parts that `decode` names of this record, where records of the view differ in their labels (see
+    /// KeptRecords). Not overriding it says that they do not.
+    [[nodiscard]] virtual KeptRecords::Parts partsOf(const View& view, const Record& record) const;
 
-    /// Writes one value into the dictionary node.
-    void setText(std::string_view label, std::string_view text) const;
-    void setText(std::string_view label, const NumberText& number) const { setText(label, number.text()); }
-
-    /// Writes all fields of the layout into the dictionary node, unless the record is shorter than its
-    /// minimum, which is ignored silently. Whether it was long enough.
-    bool show(const Record& record, const Layout& layout) const;
-    /// Has `write(node, record)` write into the dictionary node once somebody looks at it (see Writing): what
-    /// a layout does not say. It sets the same labels whatever the record.
-    template <void (*write)(Dictionary& node, const Record& record)>
-    void showWith(const Record& record) const {
-        constexpr auto later = [](Dictionary& node, Bytes bytes, const void*) { write(node, Record(bytes)); };
-        if (Dictionary* const node = dictionary())
-            node->writeLater({later, nullptr}, record.bytes());
+    /// Keeps what `decode` needs of a record, to be written into the node. Without a node it is dropped.
+    /// `store`, called before, may keep more than bytes in the section: what it replaces has been written
+    /// by then where it must be.
+    template <class Store>
+    void keep(const View& view, const Record& record, KeptRecords::Parts parts, Store store) {
+        if (prepareFor(view, parts)) {
+            store();
+            keepPrepared(view, record, parts);
+        }
     }
-    /// Puts a new array of rows (see `rows`) into the dictionary node; one that the display held under the
-    /// label stays unchanged.
-    void showList(const ListField& field, const CountedList& list, std::uint32_t logCode) const;
+    void keep(const View& view, const Record& record, KeptRecords::Parts parts) {
+        keep(view, record, parts, [] {});
+    }
 
-    /// A new array of one dictionary per entry, made by `layout`, whose minimum length is the entries' and
-    /// their stride. Where the count promises more entries than the record holds, those that lie wholly
-    /// inside are shown and one error line says so.
-    [[nodiscard]] static Array rows(const CountedList& list, const Layout& layout, std::uint32_t logCode);
-    /// That error line, where it is due.
+    /// The view of that code, or null.
+    [[nodiscard]] const View* viewOf(std::uint32_t logCode) const;
+
+    /// "Record 0x5137: 2 of 3 entries", where the record holds fewer than its count announces.
     static void reportMissingEntries(const CountedList& list, std::uint32_t logCode);
     /// The same for a list whose entries' lengths differ: `whole` of `count` lie inside the record.
     static void reportMissingEntries(std::size_t whole, std::size_t count, std::uint32_t logCode);
-
-    /// The array node emptied or refilled as above; nothing without a node.
-    void clearElements() const;
-    void replaceElements(const Array& newElements) const;
-    /// The array node refilled with such rows.
-    void showRows(const CountedList& list, const Layout& layout, std::uint32_t logCode) const;
-    /// The array node refilled by `fill(elements, record)` once somebody looks at it.
-    template <void (*fill)(Array& elements, const Record& record)>
-    void showElementsWith(const Record& record) const {
-        constexpr auto later = [](Array& elements, Bytes bytes, const void*) {
-            fill(elements, Record(bytes));
-        };
-        replaceElementsLater({later, nullptr}, record);
-    }
-
-    /// The cells of a 0xFF0001 record (see CellList). Where there are none to be had, null and the error line
-    /// "Failed to get Cell Array".
-    [[nodiscard]] const std::vector<Cell>* cellsOf(const Data& record) const;
-    /// The same without that line.
-    [[nodiscard]] const std::vector<Cell>* readCells(const Data& record) const {
-        return _cells->read(record);
-    }
-
     /// The error line for a code that the section does not handle.
     static void unknownLogMessage(std::uint32_t logCode);
 
 private:
-    void replaceElementsLater(const Writing<Array>& writing, const Record& record) const;
+    /// Precondition: there has been a node.
+    [[nodiscard]] std::size_t indexOf(const View& view) const {
+        return static_cast<std::size_t>(&view - _views.data());
+    }
+    /// Writes what the record would replace and has more to show. Whether there is a node to keep it for.
+    [[nodiscard]] bool prepareFor(const View& view, KeptRecords::Parts parts);
+    void keepPrepared(const View& view, const Record& record, KeptRecords::Parts parts);
+    void writeInto(Array& node);
 
     /// A node that the display owns. On the one thread there is, nothing takes it away while a record is
-    /// decoded, so that it is looked at without a share in it, which would cost more than to write there.
+    /// decoded, so that it is used without a share in it, which would cost more than to write there.
     template <class Node>
     class WatchedNode {
     public:
@@ -164,7 +146,9 @@ private:
     /// `sectionRef`: the one of the two that fits the node's kind.
     WatchedNode<Dictionary> _dictionaryRef;
     WatchedNode<Array> _arrayRef;
-    std::shared_ptr<CellList> _cells = std::make_shared<CellList>();
+    std::span<const View> _views; ///< as `views` gives them, since there has been a node
+    KeptRecords _records;
+    DisplayWriter::SpareRows _spareRows;
 };
 
 } // namespace velmora

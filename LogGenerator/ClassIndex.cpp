@@ -55,10 +55,20 @@ std::vector<std::string> ClassIndex::getAllLogCodes() const {
     return codes;
 }
 
+void ClassIndex::writeNodes() const {
+    for (const auto& [name, section] : classDict)
+        section->writeNode();
+}
+
+void ClassIndex::releaseSections() {
+    for (std::unique_ptr<Base>& section : _sections)
+        section.reset();
+}
+
 void ClassIndex::status() const {
-    using Held = std::remove_const_t<decltype(classDict)>;
-    logFormat(LogPriority::Warning, "Dictionary = %d", std::is_same_v<Held, ClassDictionary> ? 1 : 0);
-    logFormat(LogPriority::Warning, "String = %d", std::is_same_v<Held, std::string> ? 1 : 0);
+    using Content = std::remove_const_t<decltype(classDict)>;
+    logFormat(LogPriority::Warning, "Dictionary = %d", std::is_same_v<Content, ClassDictionary> ? 1 : 0);
+    logFormat(LogPriority::Warning, "String = %d", std::is_same_v<Content, std::string> ? 1 : 0);
 }
 
 } // namespace velmora

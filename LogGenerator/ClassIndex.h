@@ -5,18 +5,37 @@
 
 #include "LogGenerator/Base.h"
 #include "LogGenerator/Extra/CellList.h"
+#include "LogGenerator/Extra/CellSection.h"
 
 #include <memory>
 #include <string>
 #include <string_view>
+#include <type_traits>
 #include <vector>
 
 namespace velmora {
 
-/// A technology's registry: section names to sections, and log codes to the sections that want them. A
-/// technology's subclass creates its sections, owns them, and does nothing else.
+/// A technology's registry: section names to sections, and log codes to the sections that want them. It owns
+/// the sections. A technology's subclass is the list of them, one field a section; sections that share a log
+/// code are called in the order of the fields.
 class ClassIndex {
 public:
+    /// A section of the index, which makes it. The field is all that a technology says of it:
+    ///     Held<GSMServingCell> objGSMServingCell{*this};
+    template <class Section>
+    class Held {
+    public:
+        explicit Held(ClassIndex& index) : _section(index.create<Section>()) {}
+        Held(const Held&) = delete;
+        Held& operator=(const Held&) = delete;
+
+        [[nodiscard]] Section* get() const { return _section; }
+        Section* operator->() const { return _section; }
+
+    private:
+        Section* _section;
+    };
+
     ClassIndex() = default;
     /// Prints "Deallocing ClassIndex" on the console.
     virtual ~ClassIndex();
@@ -31,6 +50,8 @@ public:
     [[nodiscard]] std::vector<std::string> getAllLogCodes() const;
     /// What the sections read the cell information array with.
     [[nodiscard]] CellList& cellList() const { return *_cellList; }
+    /// Has every section write what it keeps into its node.
+    void writeNodes() const;
     /// Two log lines on what kind of object `classDict` is.
     void status() const;
 
@@ -38,16 +59,23 @@ public:
     CodeDictionary codeDictionary;
 
 protected:
-    /// Creates a section in its field and registers it: one line a section in the subclass's constructor.
-    template <class Section>
-    void create(std::unique_ptr<Section>& field) {
-        field = std::make_unique<Section>();
-        field->shareCellList(_cellList);
-        field->initWithDict(classDict, codeDictionary);
-        _routes.clear();
-    }
+    /// Destroys the sections, the first created first.
+    void releaseSections();
 
 private:
+    /// Makes a section and registers it.
+    template <class Section>
+    Section* create() {
+        auto section = std::make_unique<Section>();
+        if constexpr (std::is_base_of_v<CellSection, Section>)
+            section->shareCellList(_cellList);
+        section->initWithDict(classDict, codeDictionary);
+        _routes.clear();
+        Section* const made = section.get();
+        _sections.push_back(std::move(section));
+        return made;
+    }
+
     /// A code of `codeDictionary` and where its sections stand there; null in a place that is free.
     struct Route {
         std::uint32_t code = 0;
@@ -55,6 +83,7 @@ private:
     };
     void makeRoutes() const;
 
+    std::vector<std::unique_ptr<Base>> _sections; ///< in the order of their creation
     std::shared_ptr<CellList> _cellList = std::make_shared<CellList>();
     /// `codeDictionary` as it is looked at for every message: by the code itself, at its remainder or in the
     /// next place that is free. Made when it is asked for and codes have been added.

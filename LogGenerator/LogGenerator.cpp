@@ -28,7 +28,11 @@ LogGenerator::LogGenerator(const Clock& clock) : _clock(clock) {
 
 void LogGenerator::updateStateTelling(Dictionary& state, const Data& data, MessageEffects& effects) {
     updateState(state, data);
-    effects.display(state["Display"]);
+    effects.display(display(state));
+}
+
+Value LogGenerator::display(Dictionary& state) {
+    return state["Display"];
 }
 
 std::unique_ptr<LogGenerator> LogGenerator::generatorFromTechnology(std::string_view technology,

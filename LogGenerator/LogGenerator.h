@@ -36,6 +36,10 @@ public:
     /// The display for the current state, or none when there is nothing to show yet; appends a history entry.
     /// Called once per redraw with new data.
     [[nodiscard]] virtual Value generateLogUsingState(Dictionary& state) = 0;
+    /// The display as it stands, none where it has not been built; nothing else happens. A decoder may keep
+    /// records until the display is asked for, so that "Display" in the state may lack what came last: it is
+    /// looked at through this alone.
+    [[nodiscard]] virtual Value display(Dictionary& state);
     /// The property-list dictionary that makes the telephony service stream this technology's messages.
     [[nodiscard]] virtual DictionaryRef getStartCommand() const = 0;
     /// What a snapshot saves: dictionaries that each hold a "Description" string.

@@ -4,22 +4,18 @@
 #include "LogGenerator/OstrelLogGenerator2.h"
 
 #include "LogGenerator/MessageEffects.h"
+#include "LogMessages/LogMessage.h"
 #include "Platform/Resources.h"
 #include "Platform/SystemLog.h"
 #include "PropertyLists/PropertyList.h"
 
 #include <algorithm>
 #include <charconv>
+#include <exception>
 
 namespace velmora {
 
 namespace {
-
-constexpr std::size_t headerLength = 13;
-constexpr std::size_t prefixLength = 2;
-constexpr std::uint8_t prefixMarker = 0x81;
-constexpr std::uint8_t basebandType = 1;
-constexpr std::uint8_t extraType = 0xFF;
 
 Value loadTemplate(const std::string& name) {
     const Result<Data> file = resources().read(name, "plist");
@@ -56,12 +52,17 @@ OstrelLogGenerator2::OstrelLogGenerator2(std::string plistName, std::shared_ptr<
 }
 
 OstrelLogGenerator2::~OstrelLogGenerator2() {
+    try {
+        cIndex->writeNodes();
+    } catch (const std::exception& failure) {
+        logFormat(LogPriority::Error, "the display lacks its last records: %s", failure.what());
+    }
     // The same words for every technology.
     logFormat(LogPriority::Warning, "Ostrel_GSMLogGenerator is destructed %p", static_cast<void*>(this));
 }
 
 void OstrelLogGenerator2::updateState(Dictionary& state, const Data& data) {
-    // Builds the display on the first message; what it returns is of no use here.
+    // Builds the display on the first message.
     if (!_sectionsHaveNodes || !state.contains("Display"))
         static_cast<void>(getDisplayFromState(state));
     updateWithData(data);
@@ -69,7 +70,8 @@ void OstrelLogGenerator2::updateState(Dictionary& state, const Data& data) {
 }
 
 void OstrelLogGenerator2::updateStateTelling(Dictionary& state, const Data& data, MessageEffects& effects) {
-    static_cast<void>(getDisplayFromState(state));
+    if (!_sectionsHaveNodes || !state.contains("Display"))
+        static_cast<void>(getDisplayFromState(state));
     const std::optional<std::uint32_t> code = route(data);
     keep(data);
     effects.sections(code);
@@ -88,19 +90,18 @@ void OstrelLogGenerator2::updateWithData(const Data& message) {
 }
 
 std::optional<std::uint32_t> OstrelLogGenerator2::route(const Data& message) {
-    if (message.size() < headerLength)
+    const std::optional<LogMessage> parsed = LogMessage::parse(message.bytes());
+    if (!parsed)
         return std::nullopt;
-    std::optional<Data> stripped;
-    if (message.bytes().front() == prefixMarker)
-        stripped = message.from(prefixLength);
-    const Data& data = stripped ? *stripped : message;
-    const Record record(data);
-    const std::uint8_t type = record.u8(0);
-    if (type != basebandType && type != extraType) {
-        logFormat(LogPriority::Error, "Invalid log type: %x. Dropping.", static_cast<unsigned>(type));
+    if (parsed->type != LogMessage::basebandType && parsed->type != LogMessage::extraType) {
+        logFormat(LogPriority::Error, "Invalid log type: %x. Dropping.", static_cast<unsigned>(parsed->type));
         return std::nullopt;
     }
-    const std::uint32_t code = record.u16(3) + (type == extraType ? firstExtraCode : 0);
+    const std::uint32_t code = parsed->logCode();
+    std::optional<Data> stripped;
+    if (parsed->prefixed)
+        stripped = message.from(LogMessage::prefixLength);
+    const Data& data = stripped ? *stripped : message;
     if (const std::vector<Base*>* subscribers = cIndex->getSubscribers(code)) {
         const CellList::OneRecord one(cIndex->cellList());
         for (Base* section : *subscribers)
@@ -114,6 +115,7 @@ Value OstrelLogGenerator2::getDisplayFromState(Dictionary& state) {
         if (!_sectionsHaveNodes)
             adoptDisplay(display);
         _sectionsHaveNodes = true;
+        cIndex->writeNodes();
         return display;
     }
     if (state["Template"].isNone()) {
@@ -200,14 +202,19 @@ Value OstrelLogGenerator2::generateLogUsingState(Dictionary& state) {
     return display;
 }
 
+Value OstrelLogGenerator2::display(Dictionary& state) {
+    cIndex->writeNodes();
+    return state["Display"];
+}
+
 DictionaryRef OstrelLogGenerator2::getStartCommand() const {
     const ArrayRef logCodes = makeArray();
     const ArrayRef extraCodes = makeArray();
     for (const std::string& key : cIndex->getAllLogCodes()) {
         std::uint32_t code = 0;
         std::from_chars(key.data(), key.data() + key.size(), code);
-        if (code >= firstExtraCode)
-            extraCodes->append(code - firstExtraCode);
+        if (code >= LogMessage::firstExtraCode)
+            extraCodes->append(code - LogMessage::firstExtraCode);
         else
             logCodes->append(code);
     }

@@ -15,7 +15,8 @@ namespace velmora {
 
 /// The template-driven decoder of the binary families. It builds the display from its template once per state
 /// and hands every section its node, frames each log message and routes it by log code to the sections that
-/// want it, and moves the raw messages into the history at each refresh. A technology's subclass only chooses
+/// want it, has them write what they keep when the display is handed out, and moves the raw messages into the
+/// history at each refresh. A technology's subclass only chooses
 /// the template and the class index.
 ///
 /// State keys beside LogGenerator's: "Template", the template as it was loaded.
@@ -23,12 +24,14 @@ class OstrelLogGenerator2 : public OstrelLogGenerator {
 public:
     /// `plistName`: the template's resource name without extension.
     OstrelLogGenerator2(std::string plistName, std::shared_ptr<ClassIndex> index, const Clock& clock);
+    /// Leaves all that has arrived in the display, where the next decoder finds it.
     ~OstrelLogGenerator2() override;
 
     void updateState(Dictionary& state, const Data& data) override;
     /// Tells of the sections that want the message's code.
     void updateStateTelling(Dictionary& state, const Data& data, MessageEffects& effects) override;
     [[nodiscard]] Value generateLogUsingState(Dictionary& state) override;
+    [[nodiscard]] Value display(Dictionary& state) override;
     [[nodiscard]] DictionaryRef getStartCommand() const override;
 
     /// Frames one message and routes its record. A message below 13 bytes as it arrived is dropped silently;
@@ -42,8 +45,8 @@ public:
     /// Walks a display and logs every value that is no string, array or dictionary.
     void printDict(const Value& object) const;
 
-    /// The state's display, or none. The call that builds the display returns none, not the display: callers
-    /// take that as nothing to show yet. That is meant.
+    /// The state's display with all that has arrived, or none. The call that builds the display returns none,
+    /// not the display: callers take that as nothing to show yet. That is meant.
     [[nodiscard]] Value getDisplayFromState(Dictionary& state);
 
     [[nodiscard]] const ClassIndex& classIndex() const { return *cIndex; }

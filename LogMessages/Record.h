@@ -105,6 +105,10 @@ public:
     /// How many entries the record announces.
     [[nodiscard]] std::size_t count() const { return _count; }
 
+    /// Whether all of them lie inside the record, which takes no division.
+    [[nodiscard]] bool isWhole() const {
+        return _count == 0 || _record.has(_first + _stride * (_count - 1), _entryLength);
+    }
     /// How many of them, from the first on, lie wholly inside the record.
     [[nodiscard]] std::size_t whole() const {
         if (!_record.has(_first, _entryLength))

@@ -4,22 +4,18 @@
 #include "LogGenerator/C2K/C2KLogGenerator.h"
 
 #include "LogGenerator/C2K/LogCodeParsers.h"
+#include "LogGenerator/C2K/ValueVisitor.h"
 #include "LogGenerator/MessageEffects.h"
+#include "LogMessages/LogMessage.h"
 #include "Platform/Resources.h"
 #include "Platform/SystemLog.h"
+
 #include "PropertyLists/PropertyList.h"
+#include <exception>
 
 namespace velmora {
 
 namespace {
-
-constexpr std::size_t headerLength = 13;
-constexpr std::size_t prefixLength = 2;
-constexpr std::uint8_t prefixMarker = 0x81;
-constexpr std::uint8_t basebandType = 1;
-constexpr std::uint8_t extraType = 0xFF;
-/// What moves the extra stream's codes out of the way of the baseband's.
-constexpr std::uint32_t firstExtraCode = 0xFF0000;
 
 constexpr std::string_view sortedMarker = "_sorted";
 
@@ -43,6 +39,20 @@ Value loadTemplate() {
     return *root;
 }
 
+/// Hands values on to who wants to know what a message published.
+class EffectsVisitor final : public C2K::ValueVisitor {
+public:
+    explicit EffectsVisitor(MessageEffects& effects) : _effects(effects) {}
+
+private:
+    void publishText(std::string_view valueKey, std::string_view text) override {
+        _effects.value(valueKey, text);
+    }
+    void publish(std::string_view valueKey, const Value& value) override { _effects.value(valueKey, value); }
+
+    MessageEffects& _effects;
+};
+
 /// Adds a label to those that show the value key.
 void addTarget(Dictionary& lookup, std::string_view valueKey, std::string_view label,
                const DictionaryRef& display) {
@@ -58,6 +68,14 @@ void addTarget(Dictionary& lookup, std::string_view valueKey, std::string_view l
 }
 
 } // namespace
+
+C2KLogGenerator::~C2KLogGenerator() {
+    try {
+        _readings.write();
+    } catch (const std::exception& failure) {
+        logFormat(LogPriority::Error, "the display lacks its last records: %s", failure.what());
+    }
+}
 
 std::unique_ptr<C2KLogGenerator> C2KLogGenerator::generator(const Clock& clock) {
     return std::make_unique<C2KLogGenerator>(clock);
@@ -90,33 +108,40 @@ void C2KLogGenerator::update(Dictionary& state, const Data& data, MessageEffects
 
 void C2KLogGenerator::updateFromLog(const Data& data, const DictionaryRef& lookup, Dictionary& state,
                                     MessageEffects* effects) {
-    if (data.size() < headerLength) {
-        if (effects)
-            effects->values(std::nullopt);
+    const std::optional<LogMessage> message = LogMessage::parse(data.bytes());
+    if (effects)
+        effects->values(message ? std::optional(message->logCode()) : std::nullopt);
+    if (!message)
         return;
-    }
-    const Data stripped = data.bytes().front() == prefixMarker ? data.from(prefixLength) : data;
-    const Record record(stripped);
-    const std::uint8_t type = record.u8(0);
     // Despite its last word the record is decoded on; only the codes of the extra stream, for which the line
     // is written as well, match no parser. Both are meant.
-    if (type != basebandType)
-        logFormat(LogPriority::Error, "Invalid log type: %x. Dropping.", static_cast<unsigned>(type));
-    const std::uint32_t code = record.u16(3) + (type == extraType ? firstExtraCode : 0);
-    if (effects)
-        effects->values(code);
-    const C2K::LogCodeParser* parser = C2K::parserOfCode(code);
+    if (message->type != LogMessage::basebandType)
+        logFormat(LogPriority::Error, "Invalid log type: %x. Dropping.",
+                  static_cast<unsigned>(message->type));
+    const C2K::LogCodeParser* const parser = C2K::parserOfCode(message->logCode());
     if (!parser)
         return;
-    _targets.use(lookup);
-    parser->parse(record, state, C2K::Publisher(_targets, effects));
-    keep(stripped);
+    if (const std::optional<C2K::Reading> reading = parser->accept(Record(message->record), state)) {
+        if (effects) {
+            EffectsVisitor visitor(*effects);
+            parser->decode(*reading, visitor);
+        }
+        _readings.use(lookup);
+        _readings.keep(*parser, *reading);
+    }
+    keep(message->prefixed ? data.from(LogMessage::prefixLength) : data);
 }
 
 Value C2KLogGenerator::generateLogUsingState(Dictionary& state) {
+    _readings.write();
     Value display = getDisplayFromState(state);
     keepRefresh(state);
     return display;
+}
+
+Value C2KLogGenerator::display(Dictionary& state) {
+    _readings.write();
+    return state["Display"];
 }
 
 void C2KLogGenerator::processTemplate(const Dictionary& source, const DictionaryRef& display,

@@ -3,7 +3,7 @@
 
 #pragma once
 
-#include "LogGenerator/C2K/Targets.h"
+#include "LogGenerator/C2K/KeptReadings.h"
 #include "LogGenerator/OstrelLogGenerator.h"
 
 namespace velmora {
@@ -11,8 +11,8 @@ namespace velmora {
 /// The decoder of the technology Ostrel CDMA (CDMA2000 1x and EV-DO). It has no sections: the template
 /// "C2KTemplate" says which value stands under which label, and eight parsers, one a log code, put their
 /// values there through the lookup that is made of it. The generator holds nothing but the raw records since
-/// the last display, and what it has found in the lookup; all else is in the state, so that a new decoder
-/// goes on where an earlier one ended.
+/// the last display and the latest reading of each parser, until the display is handed out; all else is in
+/// the state, so that a new decoder goes on where an earlier one ended.
 ///
 /// State keys beside LogGenerator's: "Template" (the template as it was loaded), "Lookup" (value key to array
 /// of {"key": label, "dict": the display dictionary that holds it}), and the parsers' running values:
@@ -21,6 +21,8 @@ namespace velmora {
 class C2KLogGenerator final : public OstrelLogGenerator {
 public:
     explicit C2KLogGenerator(const Clock& clock) : OstrelLogGenerator(clock) {}
+    /// Leaves all that has arrived in the display, where the next decoder finds it.
+    ~C2KLogGenerator() override;
     [[nodiscard]] static std::unique_ptr<C2KLogGenerator> generator(const Clock& clock);
 
     [[nodiscard]] DictionaryRef getStartCommand() const override;
@@ -28,11 +30,12 @@ public:
     /// Tells of the values that the message published.
     void updateStateTelling(Dictionary& state, const Data& data, MessageEffects& effects) override;
     [[nodiscard]] Value generateLogUsingState(Dictionary& state) override;
+    [[nodiscard]] Value display(Dictionary& state) override;
 
     /// Decodes one message and keeps its record, less prefix, for the log where its code is one of the eight,
     /// whether or not the parser accepted it. `lookup`: null where the display could not be built; then the
-    /// parsers show nothing. A message below 13 bytes as it arrived is dropped silently. `effects`, unless
-    /// null, is told of the values.
+    /// parsers show nothing. A message below 13 bytes as it arrived is dropped without a log line. `effects`,
+    /// unless null, gets the values.
     void updateFromLog(const Data& data, const DictionaryRef& lookup, Dictionary& state,
                        MessageEffects* effects = nullptr);
 
@@ -42,13 +45,13 @@ public:
     static void processTemplate(const Dictionary& source, const DictionaryRef& display, Dictionary& lookup);
 
     /// The state's display, which the first call builds; none, with an error line, where there is no template
-    /// (it is looked for again on the next call).
+    /// (it is looked for again on the next call). What a decoder keeps is not written yet: see `display`.
     [[nodiscard]] static Value getDisplayFromState(Dictionary& state);
 
 private:
     void update(Dictionary& state, const Data& data, MessageEffects* effects);
 
-    C2K::Targets _targets;
+    C2K::KeptReadings _readings;
 };
 
 } // namespace velmora

@@ -3,16 +3,30 @@
 
 #pragma once
 
-#include "LogGenerator/C2K/Publisher.h"
+#include "LogGenerator/Fields/FieldVisitor.h"
+#include "LogGenerator/KeptRecords.h"
 #include "LogMessages/Record.h"
+#include "PropertyLists/Value.h"
 
 #include <cstdint>
+#include <optional>
 #include <string_view>
 
 namespace velmora::C2K {
 
-/// Turns the records of one log code into values. A parser keeps nothing itself: values that run on from
-/// record to record live in the state dictionary, which outlives decoders.
+/// What a parser takes from a record that it accepts: the bytes that it reads its values from later, and a
+/// number for what depends on earlier records.
+struct Reading {
+    Record record = Record(Bytes());
+    std::optional<double> number = std::nullopt;
+    KeptRecords::Parts parts = 1; ///< the groups of values that the reading publishes, a bit each
+
+    static constexpr std::size_t mostParts = 2;
+};
+
+/// Turns the records of one log code into values, which go by value keys ("kChannel") in place of labels. A
+/// parser keeps nothing itself: values that run on from record to record live in the state dictionary, which
+/// outlives decoders.
 class LogCodeParser {
 public:
     virtual ~LogCodeParser() = default;
@@ -22,9 +36,12 @@ public:
     [[nodiscard]] virtual std::uint16_t logCode() const = 0;
     /// What people call such records.
     [[nodiscard]] virtual std::string_view name() const = 0;
-    /// Decodes one record, prefix removed, of whatever length. One that is rejected is one log line: it
-    /// publishes nothing and leaves the state alone.
-    virtual void parse(const Record& record, Dictionary& state, const Publisher& publisher) const = 0;
+    /// Takes one record, prefix removed, of whatever length, on arrival: checks it, logs what is wrong with
+    /// it, and updates the running values. None for a record that publishes nothing; one that is rejected
+    /// leaves the state as it is. The reading refers to the record's bytes.
+    [[nodiscard]] virtual std::optional<Reading> accept(const Record& record, Dictionary& state) const = 0;
+    /// Names the values of such a reading to the visitor, in publishing order; those of its parts alone.
+    virtual void decode(const Reading& reading, FieldVisitor& visitor) const = 0;
 
 protected:
     LogCodeParser() = default;

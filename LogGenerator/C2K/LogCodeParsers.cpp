@@ -38,8 +38,12 @@ std::span<const LogCodeParser* const> logCodeParsers() {
     return parsers;
 }
 
+std::size_t placeOf(const LogCodeParser& parser) {
+    const std::span<const LogCodeParser* const> all = logCodeParsers();
+    return static_cast<std::size_t>(std::find(all.begin(), all.end(), &parser) - all.begin());
+}
+
 const LogCodeParser* parserOfCode(std::uint32_t logCode) {
-    // Asked for every message.
     static const auto codes = [] {
         std::array<std::uint32_t, parserCount> result{};
         std::transform(logCodeParsers().begin(), logCodeParsers().end(), result.begin(),

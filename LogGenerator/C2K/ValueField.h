@@ -3,8 +3,7 @@
 
 #pragma once
 
-#include "LogGenerator/C2K/NumberedTexts.h"
-#include "LogGenerator/Fields/Field.h"
+#include "LogGenerator/Fields/FieldVisitor.h"
 
 #include <algorithm>
 #include <cstddef>
@@ -14,51 +13,42 @@
 
 namespace velmora::C2K {
 
-class Publisher;
-
-/// How a field's raw value becomes text: as the sections' fields do, by a table that shows unknown values, or
-/// as six hexadecimal digits.
-struct Shown {
-    enum class Kind : std::uint8_t { Plain, Texts, Hexadecimal };
-
-    consteval Shown(const Show& plain) : show(plain) {}
-    consteval Shown(const NumberedTexts& table) : kind(Kind::Texts), texts(&table) {}
-
-    Kind kind = Kind::Plain;
-    Show show;
-    const NumberedTexts* texts = nullptr;
-};
-
-/// As "0x%06x".
-consteval Shown hexadecimal() {
-    Shown shown{Show{}};
-    shown.kind = Shown::Kind::Hexadecimal;
-    return shown;
-}
-
 /// When a field means something. One that does not is not read and shows "N/A".
-enum class When : std::uint8_t { Always, Connected };
+enum class Validity : std::uint8_t { Always, WhileConnected };
 
-/// One row of a parser's table, in publishing order.
+/// One row of a parser's table, in publishing order. The field's label is a value key.
 struct ValueField {
-    std::string_view key; ///< value key
-    Where where;
-    Shown shown;
-    When when = When::Always;
+    constexpr ValueField(std::string_view key, Place place, TextFormat format,
+                         Validity when = Validity::Always)
+        : field{key, place, format}, validity(when) {}
+
+    [[nodiscard]] constexpr bool isValid(bool connected) const {
+        return connected || validity == Validity::Always;
+    }
+
+    Field field;
+    Validity validity;
 };
 
 /// The length up to which the fields are read.
 constexpr std::size_t endOf(std::span<const ValueField> fields, bool connected) {
     std::size_t end = 0;
-    for (const ValueField& field : fields)
-        if (connected || field.when == When::Always)
-            end = std::max(end, field.where.end());
+    for (const ValueField& row : fields)
+        if (row.isValid(connected))
+            end = std::max(end, row.field.place.end());
     return end;
 }
 
-/// Publishes every field, in table order. The fields must be a constant. Precondition: the record (or the
-/// rest of it, for a sub-packet's fields) reaches to endOf(fields, connected).
-void publishFields(const Publisher& publisher, const Record& record, std::span<const ValueField> fields,
-                   bool connected);
+/// Names every field, in table order. Precondition: the record (or the rest of it, for a sub-packet's fields)
+/// reaches to endOf(fields, connected).
+inline void visitFields(std::span<const ValueField> fields, const Record& record, bool connected,
+                        FieldVisitor& visitor) {
+    for (const ValueField& row : fields) {
+        if (row.isValid(connected))
+            visitor.number(row.field, row.field.place.read(record));
+        else
+            visitor.text(row.field, "N/A");
+    }
+}
 
 } // namespace velmora::C2K

@@ -71,8 +71,9 @@ struct Cell {
     std::uint32_t present = 0; ///< bit by bit, which numbers it has
     std::array<std::int32_t, cellNumberCount> numbers;
 
+    [[nodiscard]] bool has(CellKey key) const { return (present >> key.place & 1) != 0; }
     [[nodiscard]] std::optional<std::int32_t> number(CellKey key) const {
-        return (present >> key.place & 1) != 0 ? std::optional(numbers[key.place]) : std::nullopt;
+        return has(key) ? std::optional(numbers[key.place]) : std::nullopt;
     }
     /// Takes a number in; one that 32 bits do not hold is none.
     void setNumber(std::size_t place, std::int64_t number) {

@@ -4,13 +4,11 @@
 #pragma once
 
 #include "LogGenerator/Extra/Cell.h"
-#include "LogGenerator/Fields/Field.h"
-#include "PropertyLists/Value.h"
+#include "LogGenerator/Fields/FieldVisitor.h"
 
 #include <cstdint>
 #include <span>
 #include <string_view>
-#include <vector>
 
 namespace velmora {
 
@@ -25,29 +23,25 @@ enum class CellNumber : std::uint8_t {
 inline constexpr std::int64_t levelNotMeasured = 32767;
 
 /// One row of the table of what a section shows of a cell in the cell information array. A table has at most
-/// 31 rows.
+/// 32 rows.
 struct CellField {
+    constexpr CellField(CellKey cellKey, CellNumber part, std::string_view label, TextFormat format,
+                        std::string_view failureLine)
+        : key(cellKey), number(part), field{label, computed, format}, failure(failureLine) {}
+
     CellKey key;
     CellNumber number;
-    std::string_view label;
-    Show show;
+    Field field;
     std::string_view failure; ///< the error line where the cell has no such number; empty for none
 };
 
-/// Writes every field that the cell has, in table order. Where a number is missing its error line is written
-/// instead, where there is one, the label is left as it is, and the next field follows. Without a node only
-/// the error lines are written. The fields must be a constant.
-void writeCellFields(Dictionary* node, const Cell& cell, std::span<const CellField> fields);
+/// Which of the fields the cell has, the first row in bit 0.
+[[nodiscard]] std::uint32_t fieldsOf(const Cell& cell, std::span<const CellField> fields);
 
-/// A list of cells: whose cells give a row, and what it shows.
-struct CellRows {
-    CellKind kind;
-    std::span<const CellField> fields;
-};
+/// Logs the error line of each field that the cell does not have, in table order.
+void logMissingFields(const Cell& cell, std::span<const CellField> fields);
 
-/// Makes the node's elements a row for each of the cells that the table is for, even where it has none of the
-/// fields; error lines as above. `buffer` is used again from call to call. The table must be a constant.
-void writeCellRows(Array* node, const std::vector<Cell>& cells, const CellRows& table,
-                   std::vector<std::uint8_t>& buffer);
+/// Names every field that the cell has, in table order.
+void visitCell(const Cell& cell, std::span<const CellField> fields, FieldVisitor& visitor);
 
 } // namespace velmora

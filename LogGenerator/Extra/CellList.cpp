@@ -5,6 +5,7 @@
 
 #include "LogGenerator/Extra/BinaryCellReader.h"
 #include "LogGenerator/Extra/ExtraPayload.h"
+#include "LogMessages/LogMessage.h"
 
 #include <algorithm>
 
@@ -12,7 +13,6 @@ namespace velmora {
 
 namespace {
 
-constexpr std::size_t headerLength = 13;
 /// A payload that is longer is read anew by every section, and so not kept in memory.
 constexpr std::size_t longestKept = std::size_t{1} << 16;
 
@@ -41,7 +41,7 @@ const std::vector<Cell>* CellList::read(const Data& record) {
 }
 
 bool CellList::readPayload(const Data& record) {
-    const Bytes payload = record.from(headerLength).bytes();
+    const Bytes payload = record.from(LogMessage::headerLength).bytes();
     if (!_payload.empty() && std::equal(payload.begin(), payload.end(), _payload.begin(), _payload.end()))
         return true;
     _payload.clear();

@@ -3,6 +3,7 @@
 
 #include "LogGenerator/Extra/ExtraPayload.h"
 
+#include "LogMessages/LogMessage.h"
 #include "Platform/SystemLog.h"
 #include "Platform/TelephonyService.h"
 #include "PropertyLists/PropertyList.h"
@@ -15,11 +16,10 @@ namespace velmora {
 
 namespace {
 
-constexpr std::size_t headerLength = 13;
 constexpr std::size_t longestRemembered = std::size_t{1} << 16;
 
 Result<Value> readPayload(const Data& record) {
-    return readPropertyList(record.from(headerLength).bytes());
+    return readPropertyList(record.from(LogMessage::headerLength).bytes());
 }
 
 bool holds(const Dictionary& cell, std::string_view key, std::string_view text) {
@@ -30,7 +30,7 @@ bool holds(const Dictionary& cell, std::string_view key, std::string_view text) 
 } // namespace
 
 Result<Value> RememberedPayloads::read(const Data& record) {
-    const Bytes bytes = record.from(headerLength).bytes();
+    const Bytes bytes = record.from(LogMessage::headerLength).bytes();
     for (const Payload& known : _payloads)
         if (!known.value.isNone() &&
             std::equal(bytes.begin(), bytes.end(), known.bytes.begin(), known.bytes.end()))

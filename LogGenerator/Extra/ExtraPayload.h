@@ -52,6 +52,8 @@ public:
     SIMFileReader(const Data& record, RememberedPayloads& earlier);
     /// The value under `key`; null when there is none.
     [[nodiscard]] const Value* value(std::string_view key) const;
+    /// What the payload holds, whatever its kind.
+    [[nodiscard]] const Value& files() const { return _files; }
 
 private:
     Value _files;
@@ -63,7 +65,7 @@ private:
 class ContextListReader {
 public:
     ContextListReader(const Data& record, RememberedPayloads& earlier);
-    [[nodiscard]] const Array* contexts() const { return _contexts.asArray(); }
+    [[nodiscard]] const Value& contexts() const { return _contexts; }
 
 private:
     Value _contexts;

@@ -13,11 +13,15 @@ namespace velmora {
 class PDPContextList final : public Base {
 public:
     [[nodiscard]] std::string_view getSectionName() const override { return "PDP Context Info"; }
-    [[nodiscard]] std::vector<std::uint32_t> getLogCodeArray() const override { return {0xFF0002}; }
+    [[nodiscard]] std::span<const View> views() const override;
     void updateWithData(const Data& data, std::uint32_t logCode) override;
+    void decode(const View& view, const Record& record, FieldVisitor& visitor) const override;
 
 private:
+    void trace() const override;
+
     RememberedPayloads _payloads;
+    Value _contexts; ///< of the record that is kept: an array
 };
 
 } // namespace velmora

@@ -4,15 +4,21 @@
 #include "LogGenerator/Extra/SimInfo.h"
 
 #include "LogGenerator/Extra/ExtraPayload.h"
+#include "LogMessages/LogMessage.h"
 #include "Platform/SystemLog.h"
+
+#include <iterator>
 
 namespace velmora {
 
 namespace {
 
 struct SIMFile {
+    constexpr SIMFile(std::string_view serviceKey, std::string_view label)
+        : key(serviceKey), field{label, computed, plainText()} {}
+
     std::string_view key;
-    std::string_view label;
+    Field field;
 };
 
 constexpr SIMFile simFiles[] = {
@@ -32,27 +38,38 @@ constexpr SIMFile simFiles[] = {
     {"kSimFile_OPLMNAcT", "EF-OPLMNAcT"},
 };
 
-/// The value as it stands: the service supplies what is to be shown.
-void put(Dictionary& node, std::string_view label, const Value& value) {
-    if (const std::string* text = value.asString())
-        node.setText(label, *text);
-    else
-        node.set(label, value);
-}
+constexpr View simFileViews[] = {{ExtraCode::simFiles, std::size_t{0}}};
 
 } // namespace
 
-void SimInfo::updateWithData(const Data& data, std::uint32_t logCode) {
+std::span<const View> SimInfo::views() const {
+    return simFileViews;
+}
+
+void SimInfo::trace() const {
     logLine(LogPriority::Warning, "SimInfo");
-    if (logCode != 0xFF0000)
-        return;
+}
+
+void SimInfo::updateWithData(const Data& data, std::uint32_t logCode) {
+    trace();
+    const View* const view = viewOf(logCode);
+    if (!view)
+        return; // without a log line, unlike other sections
     const LogCode_0xFF0000::SIMFileReader reader(data, _payloads);
-    Dictionary* const node = dictionary();
-    if (!node)
+    KeptRecords::Parts parts = 0;
+    for (std::size_t i = 0; i < std::size(simFiles); ++i)
+        if (reader.value(simFiles[i].key))
+            parts |= KeptRecords::Parts{1} << i;
+    keep(*view, Record(Bytes()), parts, [this, &reader] { _files = reader.files(); });
+}
+
+void SimInfo::decode(const View&, const Record&, FieldVisitor& visitor) const {
+    const Dictionary* const files = _files.asDictionary();
+    if (!files)
         return;
     for (const SIMFile& file : simFiles)
-        if (const Value* value = reader.value(file.key))
-            put(*node, file.label, *value);
+        if (const Value* const value = files->find(file.key))
+            visitor.supplied(file.field, *value);
 }
 
 } // namespace velmora

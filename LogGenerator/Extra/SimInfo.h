@@ -12,12 +12,16 @@ namespace velmora {
 class SimInfo final : public Base {
 public:
     [[nodiscard]] std::string_view getSectionName() const override { return "SIM Info"; }
-    [[nodiscard]] std::vector<std::uint32_t> getLogCodeArray() const override { return {0xFF0000}; }
+    [[nodiscard]] std::span<const View> views() const override;
     /// An unreadable payload raises LogCode_0xFF0000::UnknownDataException, which ends the program.
     void updateWithData(const Data& data, std::uint32_t logCode) override;
+    void decode(const View& view, const Record& record, FieldVisitor& visitor) const override;
 
 private:
+    void trace() const override;
+
     RememberedPayloads _payloads;
+    Value _files; ///< of the record that is kept
 };
 
 } // namespace velmora

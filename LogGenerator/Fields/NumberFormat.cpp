@@ -47,7 +47,7 @@ char* writeCount(char* to, char* end, double value, std::size_t precision) {
 
 } // namespace
 
-NumberText::NumberText(const NumberFormat& format, std::int64_t value) {
+void NumberText::format(const NumberFormat& format, std::int64_t value) {
     char* const end = _text.data() + _text.size();
     const auto result = format.conversion == 'u'
                             ? std::to_chars(_text.data(), end, static_cast<std::uint32_t>(value))
@@ -56,12 +56,13 @@ NumberText::NumberText(const NumberFormat& format, std::int64_t value) {
     finish(format);
 }
 
-NumberText::NumberText(const NumberFormat& format, double value) {
+void NumberText::format(const NumberFormat& format, double value) {
     char* const end = _text.data() + _text.size();
-    if (const char* const behind = writeCount(_text.data(), end, value, format.precision)) {
-        _length = static_cast<std::size_t>(behind - _text.data());
+    _length = 0;
+    if (const char* const after = writeCount(_text.data(), end, value, format.precision)) {
+        _length = static_cast<std::size_t>(after - _text.data());
     } else if (std::isfinite(value)) {
-        // 309 digits before the point, 32 behind it: the largest double fits.
+        // 309 digits before the point, 32 after it: the largest double fits.
         const auto result =
             std::to_chars(_text.data(), end, value, std::chars_format::fixed, format.precision);
         _length = static_cast<std::size_t>(result.ptr - _text.data());
@@ -73,23 +74,38 @@ NumberText::NumberText(const NumberFormat& format, double value) {
     finish(format);
 }
 
+void NumberText::format(std::string_view before, std::int32_t value, std::string_view after) {
+    set(before);
+    const auto result = std::to_chars(_text.data() + _length, _text.data() + _text.size(), value);
+    _length = static_cast<std::size_t>(result.ptr - _text.data());
+    append(after);
+}
+
+void NumberText::set(std::string_view text) {
+    _length = 0;
+    append(text);
+}
+
 void NumberText::append(std::string_view text) {
     const std::size_t length = std::min(text.size(), _text.size() - _length);
     std::memcpy(_text.data() + _length, text.data(), length);
     _length += length;
 }
 
+void NumberText::insert(std::size_t count, char filler) {
+    std::memmove(_text.data() + count, _text.data(), _length);
+    std::memset(_text.data(), filler, count);
+    _length += count;
+}
+
 void NumberText::finish(const NumberFormat& format) {
-    if (format.plus && _text[0] != '-') {
-        std::memmove(_text.data() + 1, _text.data(), _length);
-        _text[0] = '+';
-        ++_length;
-    }
-    if (_length < format.width) {
-        const std::size_t blanks = format.width - _length;
-        std::memmove(_text.data() + blanks, _text.data(), _length);
-        std::memset(_text.data(), ' ', blanks);
-        _length = format.width;
+    if (format.plus && _text[0] != '-')
+        insert(1, '+');
+    if (_length < format.width)
+        insert(format.width - _length, ' ');
+    if (!format.prefix.empty()) {
+        insert(format.prefix.size(), ' ');
+        std::memcpy(_text.data(), format.prefix.data(), format.prefix.size());
     }
     append(format.suffix);
 }

@@ -10,18 +10,23 @@
 
 namespace velmora {
 
-/// How a number is shown: one printf(3) conversion and the text behind it, taken apart at compile time so
-/// that showing a value parses nothing. Understood are "%d", "%u", and "%f"/"%lf" with an optional "+", width
-/// and precision; anything else does not compile.
+/// How a number is shown: one printf(3) conversion and the text around it, parsed at compile time. Understood
+/// are "%d", "%u", and "%f"/"%lf" with an optional "+", width and precision, and "%%" right after the
+/// conversion; anything else does not compile.
 struct NumberFormat {
     char conversion = 'd';      ///< 'd', 'u' or 'f'
     bool plus = false;          ///< a sign also before what is not negative
     std::uint8_t width = 0;     ///< at least so many characters, filled with blanks on the left
     std::uint8_t precision = 6; ///< decimals of 'f'
+    std::string_view prefix;    ///< what stands before the number
     std::string_view suffix;    ///< what follows the number
 
     consteval NumberFormat(const char* format) : suffix(format) {
-        expect('%');
+        prefix = suffix.substr(0, suffix.find('%'));
+        suffix.remove_prefix(prefix.size());
+        if (suffix.empty())
+            throw "a format without a conversion";
+        suffix.remove_prefix(1);
         if (suffix.starts_with('+')) {
             plus = true;
             suffix.remove_prefix(1);
@@ -37,16 +42,13 @@ struct NumberFormat {
             throw "a conversion other than d, u or f";
         conversion = suffix.front();
         suffix.remove_prefix(1);
-        if (suffix.find('%') != std::string_view::npos)
+        if (suffix.starts_with("%%"))
+            suffix.remove_prefix(1);
+        if (suffix.find('%', 1) != std::string_view::npos)
             throw "more than one conversion";
     }
 
 private:
-    consteval void expect(char wanted) {
-        if (!suffix.starts_with(wanted))
-            throw "a format that does not begin with its conversion";
-        suffix.remove_prefix(1);
-    }
     consteval std::uint8_t number() {
         unsigned value = 0;
         while (!suffix.empty() && suffix.front() >= '0' && suffix.front() <= '9') {
@@ -59,20 +61,28 @@ private:
     }
 };
 
-/// A shown number in storage of its own: long enough for every double that a record's fields can give and a
-/// suffix of up to 60 characters.
+/// A shown number in storage of its own: long enough for every double that a record's fields can give with up
+/// to 60 characters around it.
 class NumberText {
 public:
+    NumberText() {} // the storage is not initialized
+    NumberText(const NumberFormat& format, std::int64_t value) { this->format(format, value); }
+    NumberText(const NumberFormat& format, double value) { this->format(format, value); }
+
     /// As printf(3) shows `value` passed for "%d" or "%u": the low 32 bits, signed or unsigned.
-    NumberText(const NumberFormat& format, std::int64_t value);
+    void format(const NumberFormat& format, std::int64_t value);
     /// As printf(3) shows `value` passed for "%f".
-    NumberText(const NumberFormat& format, double value);
+    void format(const NumberFormat& format, double value);
+    /// The value between two texts.
+    void format(std::string_view before, std::int32_t value, std::string_view after);
+    void set(std::string_view text);
 
     [[nodiscard]] std::string_view text() const { return {_text.data(), _length}; }
 
 private:
     void append(std::string_view text);
-    /// Sign and width, then the suffix.
+    void insert(std::size_t count, char filler);
+    /// Sign and width, then the texts around.
     void finish(const NumberFormat& format);
 
     std::array<char, 448> _text;

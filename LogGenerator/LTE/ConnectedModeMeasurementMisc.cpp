@@ -21,14 +21,12 @@ constexpr Field servingFields[] = {
 };
 constexpr Layout serving = layout(IntraFrequencyRecord::minimumLength, servingFields);
 
+constexpr View sectionViews[] = {{IntraFrequencyRecord::code, serving}};
+
 } // namespace
 
-void ConnectedModeMeasurementMisc::updateWithData(const Data& data, std::uint32_t logCode) {
-    logLine(LogPriority::Warning, getSectionName());
-    if (logCode == IntraFrequencyRecord::code)
-        show(Record(data), serving);
-    else
-        unknownLogMessage(logCode);
+std::span<const View> ConnectedModeMeasurementMisc::views() const {
+    return sectionViews;
 }
 
 } // namespace velmora

@@ -13,8 +13,7 @@ public:
     [[nodiscard]] std::string_view getSectionName() const override {
         return "Connected mode LTE Intra-frequency Measurement";
     }
-    [[nodiscard]] std::vector<std::uint32_t> getLogCodeArray() const override { return {0xB179}; }
-    void updateWithData(const Data& data, std::uint32_t logCode) override;
+    [[nodiscard]] std::span<const View> views() const override;
 };
 
 } // namespace velmora

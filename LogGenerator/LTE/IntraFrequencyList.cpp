@@ -3,23 +3,29 @@
 
 #include "LogGenerator/LTE/IntraFrequencyList.h"
 
-#include "Platform/SystemLog.h"
-
 namespace velmora {
 
 using LTE::IntraFrequencyRecord;
 
-void IntraFrequencyList::updateWithData(const Data& data, std::uint32_t logCode) {
-    logLine(LogPriority::Warning, getSectionName());
-    if (logCode != IntraFrequencyRecord::code) {
-        unknownLogMessage(logCode);
-        return;
-    }
-    const Record record(data);
-    if (record.size() < IntraFrequencyRecord::minimumLength)
-        return;
+namespace {
+
+constexpr View sectionViews[] = {{IntraFrequencyRecord::code, IntraFrequencyRecord::minimumLength}};
+constexpr List rows{};
+
+} // namespace
+
+std::span<const View> IntraFrequencyList::views() const {
+    return sectionViews;
+}
+
+void IntraFrequencyList::check(const View& view, const Record& record) const {
     const IntraFrequencyRecord measurement(record);
-    showRows((measurement.*_cells)(), _cell, logCode);
+    reportMissingEntries((measurement.*_cells)(), view.code);
+}
+
+void IntraFrequencyList::decode(const View&, const Record& record, FieldVisitor& visitor) const {
+    const IntraFrequencyRecord measurement(record);
+    visitor.rows(rows, (measurement.*_cells)(), _cell);
 }
 
 } // namespace velmora

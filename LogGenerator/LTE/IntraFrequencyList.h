@@ -12,8 +12,8 @@ namespace velmora {
 /// intra-frequency measurement replaces it.
 class IntraFrequencyList : public Base {
 public:
-    [[nodiscard]] std::vector<std::uint32_t> getLogCodeArray() const final { return {0xB179}; }
-    void updateWithData(const Data& data, std::uint32_t logCode) final;
+    [[nodiscard]] std::span<const View> views() const final;
+    void decode(const View& view, const Record& record, FieldVisitor& visitor) const final;
 
 protected:
     using Cells = const CountedList& (LTE::IntraFrequencyRecord::*)() const;
@@ -22,6 +22,8 @@ protected:
     IntraFrequencyList(Cells cells, const Layout& cell) : _cells(cells), _cell(cell) {}
 
 private:
+    void check(const View& view, const Record& record) const final;
+
     Cells _cells;
     const Layout& _cell;
 };

@@ -18,30 +18,23 @@
 
 namespace velmora {
 
-/// The sections of the technology Ostrel LTE. The fields stand in the order in which the sections are
-/// created, which is the order in which those that share a log code are called.
+/// The sections of the technology Ostrel LTE. The fields are the list of sections: see ClassIndex.
 class LTEClassIndex final : public ClassIndex {
 public:
-    LTEClassIndex();
     /// Prints "Deallocing LTEClassIndex" on the console and releases the sections, the first created first.
     ~LTEClassIndex() override;
 
-    std::unique_ptr<LTEServingCellInfo> objLTEServingCellInfo;
-    std::unique_ptr<ConnectedModeMeasurementMisc> objConnectedModeMeasurementMisc;
-    std::unique_ptr<MeasuredNeighborCells> objMeasuredNeighborCells;
-    std::unique_ptr<DetectedCells> objDetectedCells;
-    std::unique_ptr<ServingCellMeasurement> objServingCellMeasurement;
-    std::unique_ptr<NeighborMeasurementMisc> objNeighborMeasurementMisc;
-    std::unique_ptr<NeighborCellsList> objNeighborCellsList;
-    std::unique_ptr<ReselectionCandidatesMisc> objReselectionCandidatesMisc;
-    std::unique_ptr<ReselectionCandidatesList> objReselectionCandidatesList;
-    std::unique_ptr<SimInfo> objSimInfo;
-    std::unique_ptr<PDPContextList> objPDPContextList;
-
-private:
-    /// Calls `visit` with every field in order.
-    template <class Visit>
-    void forEachField(Visit visit);
+    Held<LTEServingCellInfo> objLTEServingCellInfo{*this};
+    Held<ConnectedModeMeasurementMisc> objConnectedModeMeasurementMisc{*this};
+    Held<MeasuredNeighborCells> objMeasuredNeighborCells{*this};
+    Held<DetectedCells> objDetectedCells{*this};
+    Held<ServingCellMeasurement> objServingCellMeasurement{*this};
+    Held<NeighborMeasurementMisc> objNeighborMeasurementMisc{*this};
+    Held<NeighborCellsList> objNeighborCellsList{*this};
+    Held<ReselectionCandidatesMisc> objReselectionCandidatesMisc{*this};
+    Held<ReselectionCandidatesList> objReselectionCandidatesList{*this};
+    Held<SimInfo> objSimInfo{*this};
+    Held<PDPContextList> objPDPContextList{*this};
 };
 
 } // namespace velmora

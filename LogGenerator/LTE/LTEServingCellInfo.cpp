@@ -3,7 +3,6 @@
 
 #include "LogGenerator/LTE/LTEServingCellInfo.h"
 
-#include "LogGenerator/Extra/CellFields.h"
 #include "Platform/SystemLog.h"
 #include "Platform/TelephonyService.h"
 
@@ -20,9 +19,11 @@ constexpr EnumTexts bandwidths(bandwidthRows, "Unknown");
 constexpr Field antennaFields[] = {
     {"Num Tx Antennas", u8At(20), integer("%d")},
 };
-constexpr Layout antennas = layout(22, antennaFields); // 0xB0C1
+constexpr Layout antennas = layout(22, antennaFields);
+constexpr std::uint32_t antennaCode = 0xB0C1;
 
-constexpr std::size_t cellMinimumLength = 38; // 0xB0C2
+constexpr std::uint32_t cellCode = 0xB0C2;
+constexpr std::size_t cellMinimumLength = 38;
 constexpr Field carrierFields[] = {
     {"Physical Cell ID", u16At(14), integer("%d")},
     {"Download Frequency", u16At(16), integer("%d")},
@@ -48,40 +49,45 @@ constexpr CellField servingCellFields[] = {
     {kVoxCellMonitorUARFCN, CellNumber::Whole, "UARFCN", integer("%d"),
      "Serving Cell Info: Failed to retrieve UARFCN\n"},
 };
+constexpr CellKind cellKinds[] = {
+    {kVoxCellMonitorRadioAccessTechnologyLTE, kVoxCellMonitorCellTypeServing},
+};
+constexpr CellTable servingCell{cellKinds, CellTable::Shown::First, servingCellFields};
+constexpr View sectionViews[] = {
+    {cellCode, carrier.minimumLength},
+    {antennaCode, antennas},
+    cellInformation,
+};
 
 } // namespace
 
-void LTEServingCellInfo::updateWithData(const Data& data, std::uint32_t logCode) {
+std::span<const View> LTEServingCellInfo::views() const {
+    return sectionViews;
+}
+
+void LTEServingCellInfo::trace() const {
     logLine(LogPriority::Warning, "LTE Serving Cell Info"); // not the section's name
-    const Record record(data);
-    switch (logCode) {
-    case 0xB0C1:
-        // Shown, and then reported as if it were unknown: both are meant.
-        if (show(record, antennas))
-            unknownLogMessage(logCode);
-        break;
-    case 0xB0C2: showCell(record); break;
-    case 0xFF0001: showServingCell(data); break;
-    default: unknownLogMessage(logCode);
+}
+
+const CellTable& LTEServingCellInfo::cellTable() const {
+    return servingCell;
+}
+
+void LTEServingCellInfo::check(const View& view, const Record&) const {
+    // Shown, and reported as if it were unknown: both are meant.
+    if (view.code == antennaCode)
+        unknownLogMessage(view.code);
+}
+
+void LTEServingCellInfo::decode(const View& view, const Record& record, FieldVisitor& visitor) const {
+    if (view.code != cellCode) {
+        CellSection::decode(view, record, visitor);
+        return;
     }
-}
-
-void LTEServingCellInfo::showCell(const Record& record) {
-    if (!show(record, carrier))
-        return;
+    visitor.fields(record, carrier);
     // The telephony service's name for the downlink frequency goes when the baseband's arrives.
-    if (Dictionary* const node = dictionary())
-        node->removeLater("UARFCN");
-    show(record, identity);
-}
-
-void LTEServingCellInfo::showServingCell(const Data& data) {
-    const std::vector<Cell>* cells = cellsOf(data);
-    if (!cells)
-        return;
-    if (const Cell* serving =
-            firstCell(*cells, {kVoxCellMonitorRadioAccessTechnologyLTE, kVoxCellMonitorCellTypeServing}))
-        writeCellFields(dictionary(), *serving, servingCellFields);
+    visitor.removed("UARFCN");
+    visitor.fields(record, identity);
 }
 
 } // namespace velmora

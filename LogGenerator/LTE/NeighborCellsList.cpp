@@ -12,7 +12,7 @@ using LTE::NeighborRecord;
 
 namespace {
 
-constexpr Where physicalCellID = bitsAt(0, 0, 9);
+constexpr Place physicalCellID = bitsAt(0, 0, 9);
 
 // Meant as they stand: both antennas are read from the same bits, and an RSRP step is half a decibel, twice
 // the serving cell's.
@@ -31,37 +31,40 @@ constexpr Field cellFields[] = {
     {"Ant 1 Sample Offset", bitsAt(13, 3, 19), integer("%d")},
 };
 constexpr Layout cell = layout(NeighborRecord::cellLength, cellFields);
+constexpr List rows{};
 
-void trace(const Record& entry) {
+void traceCell(const Record& entry) {
     logFormat(LogPriority::Warning, "Physical Cell ID: %d\n", static_cast<int>(physicalCellID.read(entry)));
     for (const Field& field : cell.fields)
-        if (field.show.kind == Show::Kind::Real) {
+        if (field.format.kind == TextFormat::Kind::Real) {
             // One text for all five, on purpose.
-            const auto raw = static_cast<double>(field.where.read(entry));
+            const auto raw = static_cast<double>(field.place.read(entry));
             logFormat(LogPriority::Warning, "Measured RSSI: %lf\n",
-                      raw * field.show.scale + field.show.offset);
+                      raw * field.format.scale + field.format.offset);
         }
 }
 
+constexpr View sectionViews[] = {{NeighborRecord::code, NeighborRecord::minimumLength}};
+
 } // namespace
 
-void NeighborCellsList::updateWithData(const Data& data, std::uint32_t logCode) {
-    logLine(LogPriority::Warning, getSectionName());
-    if (logCode != NeighborRecord::code) {
-        unknownLogMessage(logCode);
-        return;
-    }
-    const Record record(data);
-    if (record.size() < NeighborRecord::minimumLength)
-        return;
+std::span<const View> NeighborCellsList::views() const {
+    return sectionViews;
+}
+
+void NeighborCellsList::check(const View& view, const Record& record) const {
     const NeighborRecord measurement(record);
     const CountedList& cells = measurement.cells();
     logFormat(LogPriority::Warning, "Number of neighboring cells being reported: %d\n",
               static_cast<int>(cells.count()));
     if (systemLogWants(LogPriority::Warning))
         for (std::size_t i = 0; i < cells.whole(); ++i)
-            trace(cells[i]);
-    showRows(cells, cell, logCode);
+            traceCell(cells[i]);
+    reportMissingEntries(cells, view.code);
+}
+
+void NeighborCellsList::decode(const View&, const Record& record, FieldVisitor& visitor) const {
+    visitor.rows(rows, NeighborRecord(record).cells(), cell);
 }
 
 } // namespace velmora

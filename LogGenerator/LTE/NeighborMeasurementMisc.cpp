@@ -19,14 +19,12 @@ constexpr Field headerFields[] = {
 };
 constexpr Layout header = layout(NeighborRecord::minimumLength, headerFields);
 
+constexpr View sectionViews[] = {{NeighborRecord::code, header}};
+
 } // namespace
 
-void NeighborMeasurementMisc::updateWithData(const Data& data, std::uint32_t logCode) {
-    logLine(LogPriority::Warning, getSectionName());
-    if (logCode == NeighborRecord::code)
-        show(Record(data), header);
-    else
-        unknownLogMessage(logCode);
+std::span<const View> NeighborMeasurementMisc::views() const {
+    return sectionViews;
 }
 
 } // namespace velmora

@@ -11,8 +11,7 @@ namespace velmora {
 class NeighborMeasurementMisc final : public Base {
 public:
     [[nodiscard]] std::string_view getSectionName() const override { return "Neighbor Measurements"; }
-    [[nodiscard]] std::vector<std::uint32_t> getLogCodeArray() const override { return {0xB180}; }
-    void updateWithData(const Data& data, std::uint32_t logCode) override;
+    [[nodiscard]] std::span<const View> views() const override;
 };
 
 } // namespace velmora

@@ -18,8 +18,8 @@ class IntraFrequencyRecord {
 public:
     static constexpr std::uint32_t code = 0xB179;
     static constexpr std::size_t minimumLength = 29;
-    static constexpr Where neighbourCount = u8At(27);
-    static constexpr Where detectedCount = u8At(28);
+    static constexpr Place neighbourCount = u8At(27);
+    static constexpr Place detectedCount = u8At(28);
     static_assert(neighbourCount.end() <= minimumLength && detectedCount.end() <= minimumLength);
     static constexpr std::size_t neighbourLength = 6;
     static constexpr std::size_t detectedLength = 2;
@@ -41,15 +41,15 @@ private:
 
 /// How 0xB179 shows a filtered level and quality, of the serving cell and of the neighbours alike. The
 /// quality's offset is not that of the idle-mode records (-30), on purpose.
-inline constexpr Show filteredRSRP = real("%4.2f dBm", 0.25, -140);
-inline constexpr Show filteredRSRQ = real("%4.2f dB", 0.125, -20);
+inline constexpr TextFormat filteredRSRP = real("%4.2f dBm", 0.25, -140);
+inline constexpr TextFormat filteredRSRQ = real("%4.2f dB", 0.125, -20);
 
 /// 0xB180, the neighbours that idle mode measures: a header, then 1 to 32 cells.
 class NeighborRecord {
 public:
     static constexpr std::uint32_t code = 0xB180;
     static constexpr std::size_t minimumLength = 21;
-    static constexpr Where countLessOne = bitsAt(19, 6, 5);
+    static constexpr Place countLessOne = bitsAt(19, 6, 5);
     static_assert(countLessOne.end() <= minimumLength);
     static constexpr std::size_t cellLength = 20;
 
@@ -71,7 +71,7 @@ public:
     static constexpr std::uint32_t code = 0xB186;
     static constexpr std::size_t minimumLength = 21;
     /// The low byte of a 16-bit field: 256 candidates are none, on purpose.
-    static constexpr Where count = u8At(19);
+    static constexpr Place count = u8At(19);
     static_assert(count.end() <= minimumLength);
     static constexpr std::size_t stride = 4;
 

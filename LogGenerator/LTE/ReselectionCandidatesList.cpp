@@ -18,7 +18,7 @@ constexpr EnumText ratTypeRows[] = {
     {0, "LTE"}, {1, "UTRAN"}, {2, "GERAN"}, {3, "CDMA1XRTT"}, {4, "CDMAHRPD"},
 };
 constexpr EnumTexts ratTypes(ratTypeRows, "??");
-constexpr Where ratType = u16At(2);
+constexpr Place ratType = u16At(2);
 
 constexpr Field headerFields[] = {
     {"Candidate Priority", u16At(0), integer("%d")},
@@ -66,32 +66,33 @@ std::size_t wholeCandidates(const ReselectionRecord& reselection, const CountedL
     return i;
 }
 
-void fill(Array& rows, const Record& record) {
-    const ReselectionRecord reselection(record);
-    const CountedList headers = reselection.candidates(header.minimumLength);
-    for (std::size_t i = 0, count = wholeCandidates(reselection, headers); i < count; ++i) {
-        const Layout& detail = detailsOf(headers[i]);
-        Dictionary& row = rows.appendRow();
-        writeFields(row, headers[i], header);
-        writeFields(row, reselection.candidates(detail.minimumLength)[i], detail);
-    }
-}
+constexpr List rows{};
+constexpr View sectionViews[] = {{ReselectionRecord::code, ReselectionRecord::minimumLength}};
 
 } // namespace
 
-void ReselectionCandidatesList::updateWithData(const Data& data, std::uint32_t logCode) {
-    logLine(LogPriority::Warning, getSectionName());
-    if (logCode != ReselectionRecord::code) {
-        unknownLogMessage(logCode);
-        return;
-    }
-    const Record record(data);
-    if (record.size() < ReselectionRecord::minimumLength)
-        return;
+std::span<const View> ReselectionCandidatesList::views() const {
+    return sectionViews;
+}
+
+void ReselectionCandidatesList::check(const View& view, const Record& record) const {
     const ReselectionRecord reselection(record);
     const CountedList headers = reselection.candidates(header.minimumLength);
-    reportMissingEntries(wholeCandidates(reselection, headers), headers.count(), logCode);
-    showElementsWith<fill>(record);
+    reportMissingEntries(wholeCandidates(reselection, headers), headers.count(), view.code);
+}
+
+void ReselectionCandidatesList::decode(const View&, const Record& record, FieldVisitor& visitor) const {
+    const ReselectionRecord reselection(record);
+    const CountedList headers = reselection.candidates(header.minimumLength);
+    visitor.beginList(rows);
+    for (std::size_t i = 0, count = wholeCandidates(reselection, headers); i < count; ++i) {
+        const Layout& detail = detailsOf(headers[i]);
+        visitor.beginRow();
+        visitor.fields(headers[i], header);
+        visitor.fields(reselection.candidates(detail.minimumLength)[i], detail);
+        visitor.endRow();
+    }
+    visitor.endList();
 }
 
 } // namespace velmora

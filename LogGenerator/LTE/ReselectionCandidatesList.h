@@ -11,8 +11,11 @@ namespace velmora {
 class ReselectionCandidatesList final : public Base {
 public:
     [[nodiscard]] std::string_view getSectionName() const override { return "Reselection Candidates List"; }
-    [[nodiscard]] std::vector<std::uint32_t> getLogCodeArray() const override { return {0xB186}; }
-    void updateWithData(const Data& data, std::uint32_t logCode) override;
+    [[nodiscard]] std::span<const View> views() const override;
+    void decode(const View& view, const Record& record, FieldVisitor& visitor) const override;
+
+private:
+    void check(const View& view, const Record& record) const override;
 };
 
 } // namespace velmora

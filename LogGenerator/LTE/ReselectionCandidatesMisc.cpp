@@ -19,14 +19,12 @@ constexpr Field headerFields[] = {
 };
 constexpr Layout header = layout(ReselectionRecord::minimumLength, headerFields);
 
+constexpr View sectionViews[] = {{ReselectionRecord::code, header}};
+
 } // namespace
 
-void ReselectionCandidatesMisc::updateWithData(const Data& data, std::uint32_t logCode) {
-    logLine(LogPriority::Warning, getSectionName());
-    if (logCode == ReselectionRecord::code)
-        show(Record(data), header);
-    else
-        unknownLogMessage(logCode);
+std::span<const View> ReselectionCandidatesMisc::views() const {
+    return sectionViews;
 }
 
 } // namespace velmora

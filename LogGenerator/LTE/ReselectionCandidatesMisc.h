@@ -11,8 +11,7 @@ namespace velmora {
 class ReselectionCandidatesMisc final : public Base {
 public:
     [[nodiscard]] std::string_view getSectionName() const override { return "Reselection Candidates"; }
-    [[nodiscard]] std::vector<std::uint32_t> getLogCodeArray() const override { return {0xB186}; }
-    void updateWithData(const Data& data, std::uint32_t logCode) override;
+    [[nodiscard]] std::span<const View> views() const override;
 };
 
 } // namespace velmora

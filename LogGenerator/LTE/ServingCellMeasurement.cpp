@@ -34,14 +34,12 @@ constexpr Field measurementFields[] = {
 };
 constexpr Layout measurement = layout(33, measurementFields); // 0xB17F
 
+constexpr View sectionViews[] = {{0xB17F, measurement}};
+
 } // namespace
 
-void ServingCellMeasurement::updateWithData(const Data& data, std::uint32_t logCode) {
-    logLine(LogPriority::Warning, getSectionName());
-    if (logCode == 0xB17F)
-        show(Record(data), measurement);
-    else
-        unknownLogMessage(logCode);
+std::span<const View> ServingCellMeasurement::views() const {
+    return sectionViews;
 }
 
 } // namespace velmora

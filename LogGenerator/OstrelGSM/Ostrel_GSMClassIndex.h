@@ -33,46 +33,39 @@
 
 namespace velmora {
 
-/// The sections of the technology Ostrel GSM. The fields stand in the order in which the sections are
-/// created, which is the order in which those that share a log code are called.
+/// The sections of the technology Ostrel GSM. The fields are the list of sections: see ClassIndex.
 class Ostrel_GSMClassIndex final : public ClassIndex {
 public:
-    Ostrel_GSMClassIndex();
     /// Prints "Deallocing Ostrel_GSMClassIndex" on the console and releases the sections, the first created
     /// first.
     ~Ostrel_GSMClassIndex() override;
 
-    std::unique_ptr<ActiveSet> objActiveSet;
-    std::unique_ptr<CodingScheme> objCodingScheme;
-    std::unique_ptr<GPRSInformation> objGPRSInformation;
-    std::unique_ptr<GSMServingCell> objGSMServingCell;
-    std::unique_ptr<MobileAllocation> objMobileAllocation;
-    std::unique_ptr<NeighboringCells> objNeighboringCells;
-    std::unique_ptr<PDPContextList> objPDPContextList;
-    std::unique_ptr<ProcessPS> objProcessPS;
-    std::unique_ptr<UMTSRRMeasurement> objUMTSRRMeasurement;
-    std::unique_ptr<CellChangeCounters> objCellChangeCounter;
-    std::unique_ptr<DetectedSet> objDetectedSet;
-    std::unique_ptr<GSMSet> objGSMSet;
-    std::unique_ptr<NonRankedGSMSet> objNonRankedGSMSet;
-    std::unique_ptr<ProcessCO> objProcessCO;
-    std::unique_ptr<ServingPLMN> objServingPLMN;
-    std::unique_ptr<UMTSSet> objUMTSSet;
-    std::unique_ptr<EquivalentPLMNList> objEquivalentPLMNList;
-    std::unique_ptr<GSMRRInfo> objGSMRRInfo;
-    std::unique_ptr<MonitoredSet> objMonitoredSet;
-    std::unique_ptr<NonRankedUMTSSet> objNonRankedUMTSSet;
-    std::unique_ptr<ProcessCS> objProcessCS;
-    std::unique_ptr<UMTSRRInfo> objUMTSRRInfo;
-    std::unique_ptr<BLER> objBLER;
-    std::unique_ptr<VirtualActiveSet> objVirtualActiveSet;
-    std::unique_ptr<SimInfo> objSimInfo;
-    std::unique_ptr<HSDPAInformation> objHSDPAInformation;
-
-private:
-    /// Calls `visit` with every field in order.
-    template <class Visit>
-    void forEachField(Visit visit);
+    Held<ActiveSet> objActiveSet{*this};
+    Held<CodingScheme> objCodingScheme{*this};
+    Held<GPRSInformation> objGPRSInformation{*this};
+    Held<GSMServingCell> objGSMServingCell{*this};
+    Held<MobileAllocation> objMobileAllocation{*this};
+    Held<NeighboringCells> objNeighboringCells{*this};
+    Held<PDPContextList> objPDPContextList{*this};
+    Held<ProcessPS> objProcessPS{*this};
+    Held<UMTSRRMeasurement> objUMTSRRMeasurement{*this};
+    Held<CellChangeCounters> objCellChangeCounter{*this};
+    Held<DetectedSet> objDetectedSet{*this};
+    Held<GSMSet> objGSMSet{*this};
+    Held<NonRankedGSMSet> objNonRankedGSMSet{*this};
+    Held<ProcessCO> objProcessCO{*this};
+    Held<ServingPLMN> objServingPLMN{*this};
+    Held<UMTSSet> objUMTSSet{*this};
+    Held<EquivalentPLMNList> objEquivalentPLMNList{*this};
+    Held<GSMRRInfo> objGSMRRInfo{*this};
+    Held<MonitoredSet> objMonitoredSet{*this};
+    Held<NonRankedUMTSSet> objNonRankedUMTSSet{*this};
+    Held<ProcessCS> objProcessCS{*this};
+    Held<UMTSRRInfo> objUMTSRRInfo{*this};
+    Held<BLER> objBLER{*this};
+    Held<VirtualActiveSet> objVirtualActiveSet{*this};
+    Held<SimInfo> objSimInfo{*this};
+    Held<HSDPAInformation> objHSDPAInformation{*this};
 };
 
 } // namespace velmora

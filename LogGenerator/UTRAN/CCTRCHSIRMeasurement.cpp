@@ -18,17 +18,14 @@ constexpr Field channelFields[] = {
 };
 constexpr Layout channel = layout(quality::compositeChannelLength, channelFields);
 
-constexpr std::size_t firstRatio = 2;
-constexpr std::size_t ratioCount = 6;
-static_assert(firstRatio + ratioCount == quality::compositeChannelLength);
-
-Array ratios(const Record& entry) {
-    const CountedList values(entry, firstRatio, 1, ratioCount);
-    Array result;
-    for (std::size_t i = 0; i < ratioCount; ++i)
-        result.append(NumberText("%d", std::int64_t{values[i].u8(0)}).text());
-    return result;
-}
+/// The signal-to-interference ratios, as the modem reports them.
+constexpr Field ratio[] = {
+    {"", u8At(2), integer("%d")}, {"", u8At(3), integer("%d")}, {"", u8At(4), integer("%d")},
+    {"", u8At(5), integer("%d")}, {"", u8At(6), integer("%d")}, {"", u8At(7), integer("%d")},
+};
+static_assert(ratio[5].place.end() == quality::compositeChannelLength);
+constexpr List rows{};
+constexpr List ratios{"SIR", List::Entries::Values, ""};
 
 CountedList compositeChannels(const Record& record) {
     const auto transportChannels = static_cast<std::size_t>(quality::transportChannels.read(record));
@@ -37,24 +34,37 @@ CountedList compositeChannels(const Record& record) {
                        static_cast<std::size_t>(quality::compositeChannels.read(record)));
 }
 
-void fill(Array& rows, const Record& record) {
-    const CountedList channels = compositeChannels(record);
-    for (std::size_t i = 0; i < channels.whole(); ++i) {
-        Dictionary& row = rows.appendRow();
-        writeFields(row, channels[i], channel);
-        row.set("SIR", std::make_shared<Array>(ratios(channels[i])));
-    }
-}
+constexpr View sectionViews[] = {{quality::code, quality::minimumLength}};
 
 } // namespace
 
-void CCTRCHSIRMeasurement::updateWithData(const Data& data, std::uint32_t logCode) {
+std::span<const View> CCTRCHSIRMeasurement::views() const {
+    return sectionViews;
+}
+
+void CCTRCHSIRMeasurement::trace() const {
     logLine(LogPriority::Warning, "CCTRCH SIR Measurement");
-    const Record record(data);
-    if (logCode != quality::code || record.size() < quality::minimumLength)
-        return;
-    reportMissingEntries(compositeChannels(record), logCode);
-    showElementsWith<fill>(record);
+}
+
+void CCTRCHSIRMeasurement::unknownCode(std::uint32_t) const {}
+
+void CCTRCHSIRMeasurement::check(const View& view, const Record& record) const {
+    reportMissingEntries(compositeChannels(record), view.code);
+}
+
+void CCTRCHSIRMeasurement::decode(const View&, const Record& record, FieldVisitor& visitor) const {
+    const CountedList channels = compositeChannels(record);
+    visitor.beginList(rows);
+    for (std::size_t i = 0; i < channels.whole(); ++i) {
+        visitor.beginRow();
+        visitor.fields(channels[i], channel);
+        visitor.beginList(ratios);
+        for (const Field& each : ratio)
+            visitor.number(each, each.place.read(channels[i]));
+        visitor.endList();
+        visitor.endRow();
+    }
+    visitor.endList();
 }
 
 } // namespace velmora

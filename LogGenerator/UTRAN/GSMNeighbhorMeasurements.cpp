@@ -11,7 +11,7 @@ namespace {
 
 constexpr std::uint32_t code = 0xD00E;
 constexpr std::size_t minimumLength = 17;
-constexpr Where count = u8At(16);
+constexpr Place count = u8At(16);
 static_assert(count.end() <= minimumLength);
 
 constexpr Field cellFields[] = {
@@ -30,20 +30,33 @@ CountedList cells(const Record& record) {
                        static_cast<std::size_t>(count.read(record)));
 }
 
+constexpr List rows{};
+constexpr View sectionViews[] = {{code, minimumLength}};
+
 } // namespace
 
-void GSMNeighbhorMeasurements::updateWithData(const Data& data, std::uint32_t logCode) {
-    logLine(LogPriority::Warning, "GSM Neighbor Cell List");
-    const Record record(data);
-    if (logCode != code || record.size() < minimumLength)
-        return;
-    clearElements();
-    // The rows are not shown, and so not even made: see the header.
-    reportMissingEntries(cells(record), code);
+std::span<const View> GSMNeighbhorMeasurements::views() const {
+    return sectionViews;
 }
 
-Array GSMNeighbhorMeasurements::neighbours(const Record& record) {
-    return rows(cells(record), cell, code);
+void GSMNeighbhorMeasurements::trace() const {
+    logLine(LogPriority::Warning, "GSM Neighbor Cell List");
+}
+
+void GSMNeighbhorMeasurements::unknownCode(std::uint32_t) const {}
+
+void GSMNeighbhorMeasurements::check(const View& view, const Record& record) const {
+    reportMissingEntries(cells(record), view.code);
+}
+
+void GSMNeighbhorMeasurements::decode(const View&, const Record&, FieldVisitor& visitor) const {
+    // The rows are not shown: see the header.
+    visitor.beginList(rows);
+    visitor.endList();
+}
+
+void GSMNeighbhorMeasurements::visitNeighbours(const Record& record, FieldVisitor& visitor) {
+    visitor.rows(rows, cells(record), cell);
 }
 
 } // namespace velmora

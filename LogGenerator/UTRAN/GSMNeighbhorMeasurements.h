@@ -13,12 +13,17 @@ namespace velmora {
 class GSMNeighbhorMeasurements final : public Base {
 public:
     [[nodiscard]] std::string_view getSectionName() const override { return "GSM Neighbor Cell List"; }
-    [[nodiscard]] std::vector<std::uint32_t> getLogCodeArray() const override { return {0xD00E}; }
-    void updateWithData(const Data& data, std::uint32_t logCode) override;
+    [[nodiscard]] std::span<const View> views() const override;
+    void decode(const View& view, const Record& record, FieldVisitor& visitor) const override;
 
-    /// The rows of a 0xD00E record, one per GSM cell. Entries that its count promises and that it does not
-    /// hold are reported. Precondition: the record has 17 bytes.
-    [[nodiscard]] static Array neighbours(const Record& record);
+    /// Names the rows of a 0xD00E record, one per GSM cell, which the section does not show. Precondition:
+    /// the record has 17 bytes.
+    static void visitNeighbours(const Record& record, FieldVisitor& visitor);
+
+private:
+    void trace() const override;
+    void unknownCode(std::uint32_t logCode) const override;
+    void check(const View& view, const Record& record) const override;
 };
 
 } // namespace velmora

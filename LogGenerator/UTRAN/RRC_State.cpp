@@ -10,9 +10,7 @@ namespace velmora {
 namespace {
 
 constexpr std::size_t expectedLength = 15; // 0xD0E0
-constexpr Where version = u8At(13);
-constexpr Where mode = u8At(14);
-static_assert(mode.end() <= expectedLength);
+constexpr Place version = u8At(13);
 
 constexpr std::int64_t knownVersion = 1;
 /// What the mode reads as in a record of another version.
@@ -23,9 +21,11 @@ constexpr EnumText stateRows[] = {
     {3, "Cell DCH"},     {4, "Cell PCH"},   {5, "Cell URA PCH"},
 };
 constexpr EnumTexts states(stateRows, "Unknown RRC Mode");
+constexpr Field state{"State", u8At(14), text(states)};
+static_assert(state.place.end() <= expectedLength);
 
 /// The field of a record that may be too short for it.
-std::int64_t readOr(const Record& record, const Where& where, std::int64_t missing) {
+std::int64_t readOr(const Record& record, const Place& where, std::int64_t missing) {
     return record.size() >= where.end() ? where.read(record) : missing;
 }
 
@@ -53,24 +53,45 @@ std::string description(const Value& value) {
     return "(null)";
 }
 
+/// The RRC mode; what the record lacks reads as version 0 and as no mode.
+std::int64_t modeOf(const Record& record) {
+    return readOr(record, version, 0) == knownVersion ? readOr(record, state.place, noMode) : noMode;
+}
+
+// A short record is decoded as well, see updateWithData.
+constexpr View sectionViews[] = {{0xD0E0, std::size_t{0}}};
+
 } // namespace
 
-void RRC_State::updateWithData(const Data& data, std::uint32_t logCode) {
+std::span<const View> RRC_State::views() const {
+    return sectionViews;
+}
+
+void RRC_State::trace() const {
     logLine(LogPriority::Warning, "RRC Info");
-    if (logCode != 0xD0E0)
-        return;
+}
+
+void RRC_State::unknownCode(std::uint32_t) const {}
+
+void RRC_State::updateWithData(const Data& data, std::uint32_t logCode) {
+    Base::updateWithData(data, logCode);
     const Record record(data);
+    if (!viewOf(logCode) || !systemLogWants(LogPriority::Warning))
+        return;
+    const std::int64_t current = modeOf(record);
+    logFormat(LogPriority::Warning, "Display Dict = %s, rrc mode = %d %s", description(node()).c_str(),
+              static_cast<int>(current), std::string(FormattedText(state.format, current).view()).c_str());
+}
+
+void RRC_State::check(const View&, const Record& record) const {
     // The warning does not stop the decoding, on purpose.
     if (record.size() < expectedLength)
         logFormat(LogPriority::Warning, "LogCode_0xD0E0 is length is %ld expected size %ld",
                   static_cast<long>(record.size()), static_cast<long>(expectedLength));
-    const std::int64_t current =
-        readOr(record, version, 0) == knownVersion ? readOr(record, mode, noMode) : noMode;
-    const std::string_view state = states[static_cast<std::uint32_t>(current)];
-    setText("State", state);
-    if (systemLogWants(LogPriority::Warning))
-        logFormat(LogPriority::Warning, "Display Dict = %s, rrc mode = %d %s", description(node()).c_str(),
-                  static_cast<int>(current), std::string(state).c_str());
+}
+
+void RRC_State::decode(const View&, const Record& record, FieldVisitor& visitor) const {
+    visitor.number(state, modeOf(record));
 }
 
 } // namespace velmora

@@ -11,10 +11,16 @@ namespace velmora {
 class RRC_State final : public Base {
 public:
     [[nodiscard]] std::string_view getSectionName() const override { return "RRC Info"; }
-    [[nodiscard]] std::vector<std::uint32_t> getLogCodeArray() const override { return {0xD0E0}; }
+    [[nodiscard]] std::span<const View> views() const override;
     /// A record below 15 bytes is warned of and decoded all the same: what it lacks reads as version 0 and as
     /// mode 255, which is unknown.
     void updateWithData(const Data& data, std::uint32_t logCode) override;
+    void decode(const View& view, const Record& record, FieldVisitor& visitor) const override;
+
+private:
+    void trace() const override;
+    void unknownCode(std::uint32_t logCode) const override;
+    void check(const View& view, const Record& record) const override;
 };
 
 } // namespace velmora

@@ -14,14 +14,14 @@ namespace velmora::UTRAN::quality {
 inline constexpr std::uint32_t code = 0xD00C;
 inline constexpr std::size_t minimumLength = 17;
 
-inline constexpr Where transportChannels = bitsAt(14, 6, 6);
-inline constexpr Where compositeChannels = bitsAt(15, 4, 4);
+inline constexpr Place transportChannels = bitsAt(14, 6, 6);
+inline constexpr Place compositeChannels = bitsAt(15, 4, 4);
 static_assert(transportChannels.end() <= minimumLength && compositeChannels.end() <= minimumLength);
 
 /// The entries of the transport channels follow the minimum.
 inline constexpr std::size_t transportChannelLength = 2;
 
-/// Where the composite channels' entries begin. The 34 bytes that each transport channel moves them by are
+/// Place the composite channels' entries begin. The 34 bytes that each transport channel moves them by are
 /// not what its entry takes; they are kept as they stand.
 constexpr std::size_t firstCompositeChannel(std::size_t transportChannelCount) {
     return 289 + 34 * transportChannelCount;

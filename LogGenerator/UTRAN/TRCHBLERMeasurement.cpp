@@ -17,17 +17,33 @@ constexpr Field channelFields[] = {
     {"TRCH BLER Measurement", u8At(1), integer("%d")},
 };
 constexpr Layout channel = layout(quality::transportChannelLength, channelFields);
+constexpr List rows{};
+
+CountedList channels(const Record& record) {
+    return CountedList(record, quality::minimumLength, quality::transportChannelLength,
+                       static_cast<std::size_t>(quality::transportChannels.read(record)));
+}
+
+constexpr View sectionViews[] = {{quality::code, quality::minimumLength}};
 
 } // namespace
 
-void TRCHBLERMeasurement::updateWithData(const Data& data, std::uint32_t logCode) {
+std::span<const View> TRCHBLERMeasurement::views() const {
+    return sectionViews;
+}
+
+void TRCHBLERMeasurement::trace() const {
     logLine(LogPriority::Notice, "TRCH BLER Measurement"); // the one section whose line is a notice
-    const Record record(data);
-    if (logCode != quality::code || record.size() < quality::minimumLength)
-        return;
-    const CountedList channels(record, quality::minimumLength, quality::transportChannelLength,
-                               static_cast<std::size_t>(quality::transportChannels.read(record)));
-    showRows(channels, channel, logCode);
+}
+
+void TRCHBLERMeasurement::unknownCode(std::uint32_t) const {}
+
+void TRCHBLERMeasurement::check(const View& view, const Record& record) const {
+    reportMissingEntries(channels(record), view.code);
+}
+
+void TRCHBLERMeasurement::decode(const View&, const Record& record, FieldVisitor& visitor) const {
+    visitor.rows(rows, channels(record), channel);
 }
 
 } // namespace velmora

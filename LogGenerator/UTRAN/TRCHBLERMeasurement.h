@@ -11,8 +11,13 @@ namespace velmora {
 class TRCHBLERMeasurement final : public Base {
 public:
     [[nodiscard]] std::string_view getSectionName() const override { return "TRCH BLER"; }
-    [[nodiscard]] std::vector<std::uint32_t> getLogCodeArray() const override { return {0xD00C}; }
-    void updateWithData(const Data& data, std::uint32_t logCode) override;
+    [[nodiscard]] std::span<const View> views() const override;
+    void decode(const View& view, const Record& record, FieldVisitor& visitor) const override;
+
+private:
+    void trace() const override;
+    void unknownCode(std::uint32_t logCode) const override;
+    void check(const View& view, const Record& record) const override;
 };
 
 } // namespace velmora

@@ -15,21 +15,18 @@
 
 namespace velmora {
 
-/// The sections of the technology Ostrel UTRAN2. The fields stand in the order in which the sections are
-/// created, which is the order in which those that share a log code are called. Its destruction says nothing
-/// of its own.
+/// The sections of the technology Ostrel UTRAN2. The fields are the list of sections: see ClassIndex. Its
+/// destruction says nothing of its own.
 class UTRANClassIndex final : public ClassIndex {
 public:
-    UTRANClassIndex();
-
-    std::unique_ptr<RRC_State> rrc_state;
-    std::unique_ptr<UTRANServingCellInfo> servingCellInfo;
-    std::unique_ptr<UTRANNeighbhorMeasurements> tdMeasurements;
-    std::unique_ptr<GSMNeighbhorMeasurements> gsmMeasurements;
-    std::unique_ptr<TRCHBLERMeasurement> trchMeasurements;
-    std::unique_ptr<CCTRCHSIRMeasurement> cctrchMeasurements;
-    std::unique_ptr<PDPContextList> pdpList;
-    std::unique_ptr<SimInfo> simInfo;
+    Held<RRC_State> rrc_state{*this};
+    Held<UTRANServingCellInfo> servingCellInfo{*this};
+    Held<UTRANNeighbhorMeasurements> tdMeasurements{*this};
+    Held<GSMNeighbhorMeasurements> gsmMeasurements{*this};
+    Held<TRCHBLERMeasurement> trchMeasurements{*this};
+    Held<CCTRCHSIRMeasurement> cctrchMeasurements{*this};
+    Held<PDPContextList> pdpList{*this};
+    Held<SimInfo> simInfo{*this};
 };
 
 } // namespace velmora

@@ -5,21 +5,19 @@
 
 #include "Platform/SystemLog.h"
 
-#include <iterator>
-
 namespace velmora {
 
 namespace {
 
 constexpr std::size_t minimumLength = 21; // 0xD00A
-constexpr Where count = bitsAt(16, 1, 7);
+constexpr Place count = bitsAt(16, 1, 7);
 static_assert(count.end() <= minimumLength);
 
-/// The entries lie far behind the minimum.
+/// The entries lie far past the minimum.
 constexpr std::size_t firstEntry = 168;
 constexpr std::size_t entryLength = 16;
 
-// The fields stand bit by bit behind one another in the entry's first four bytes.
+// The fields stand bit by bit one after the other in the entry's first four bytes.
 constexpr Field cellFields[] = {
     {"UARFCN", bitsAt(0, 0, 14), integer("%d")},
     {"Cell ID", bitsAt(1, 6, 7), integer("%d")},
@@ -27,39 +25,54 @@ constexpr Field cellFields[] = {
 };
 constexpr Layout cell = layout(entryLength, cellFields);
 
-constexpr Where status = bitsAt(3, 5, 2);
-// The last of the four has no text: the label is left out of its row.
-constexpr std::string_view statusTexts[] = {"ASET", "MSET", "DSET"};
+constexpr EnumText statusRows[] = {{0, "ASET"}, {1, "MSET"}, {2, "DSET"}};
+constexpr EnumTexts statuses(statusRows, "");
+constexpr Field status{"Status", bitsAt(3, 5, 2), text(statuses)};
+static_assert(status.place.end() <= entryLength);
+/// The last of the four has no text: the label is left out of its row.
+constexpr std::int64_t noSet = 3;
 
 constexpr Field detectionFields[] = {
     {"inJDCS", bitsAt(3, 7, 1), flag("TRUE", "FALSE")},
 };
 constexpr Layout detection = layout(entryLength, detectionFields);
 
+constexpr List rows{};
+
 CountedList cells(const Record& record) {
     return CountedList(record, firstEntry, entryLength, static_cast<std::size_t>(count.read(record)));
 }
 
-void fill(Array& rows, const Record& record) {
-    const CountedList entries = cells(record);
-    for (std::size_t i = 0; i < entries.whole(); ++i) {
-        Dictionary& row = rows.appendRow();
-        writeFields(row, entries[i], cell);
-        if (const auto set = static_cast<std::size_t>(status.read(entries[i])); set < std::size(statusTexts))
-            row.setText("Status", statusTexts[set]);
-        writeFields(row, entries[i], detection);
-    }
-}
+constexpr View sectionViews[] = {{0xD00A, minimumLength}};
 
 } // namespace
 
-void UTRANNeighbhorMeasurements::updateWithData(const Data& data, std::uint32_t logCode) {
+std::span<const View> UTRANNeighbhorMeasurements::views() const {
+    return sectionViews;
+}
+
+void UTRANNeighbhorMeasurements::trace() const {
     logLine(LogPriority::Warning, "NeighbhorMeasurements List");
-    const Record record(data);
-    if (logCode != 0xD00A || record.size() < minimumLength)
-        return;
-    reportMissingEntries(cells(record), logCode);
-    showElementsWith<fill>(record);
+}
+
+void UTRANNeighbhorMeasurements::unknownCode(std::uint32_t) const {}
+
+void UTRANNeighbhorMeasurements::check(const View& view, const Record& record) const {
+    reportMissingEntries(cells(record), view.code);
+}
+
+void UTRANNeighbhorMeasurements::decode(const View&, const Record& record, FieldVisitor& visitor) const {
+    const CountedList entries = cells(record);
+    visitor.beginList(rows);
+    for (std::size_t i = 0; i < entries.whole(); ++i) {
+        visitor.beginRow();
+        visitor.fields(entries[i], cell);
+        if (const std::int64_t set = status.place.read(entries[i]); set != noSet)
+            visitor.number(status, set);
+        visitor.fields(entries[i], detection);
+        visitor.endRow();
+    }
+    visitor.endList();
 }
 
 } // namespace velmora

@@ -3,7 +3,6 @@
 
 #include "LogGenerator/UTRAN/UTRANServingCellInfo.h"
 
-#include "LogGenerator/Extra/CellFields.h"
 #include "Platform/SystemLog.h"
 #include "Platform/TelephonyService.h"
 
@@ -35,28 +34,31 @@ constexpr CellField knownFields[] = {
     // The service knows one channel number, which stands under both labels: that is meant.
     {kVoxCellMonitorUARFCN, CellNumber::Whole, "Downlink UARFCN", integer("%d"), ""},
 };
+constexpr CellKind cellKinds[] = {
+    {kVoxCellMonitorRadioAccessTechnologyUTRAN, kVoxCellMonitorCellTypeServing},
+};
+constexpr CellTable knownCells{cellKinds, CellTable::Shown::Last, knownFields};
+constexpr View sectionViews[] = {
+    {0xD0E2, servingCell},
+    cellInformation,
+};
 
 } // namespace
 
-void UTRANServingCellInfo::updateWithData(const Data& data, std::uint32_t logCode) {
-    logLine(LogPriority::Warning, "Serving Cell Info");
-    switch (logCode) {
-    case 0xD0E2: show(Record(data), servingCell); break;
-    case 0xFF0001: showServingCells(data); break;
-    default: break;
-    }
+std::span<const View> UTRANServingCellInfo::views() const {
+    return sectionViews;
 }
 
-void UTRANServingCellInfo::showServingCells(const Data& data) const {
-    // What is no array is passed over without the line that other sections write.
-    const std::vector<Cell>* cells = readCells(data);
-    if (!cells)
-        return;
-    constexpr CellKind serving(kVoxCellMonitorRadioAccessTechnologyUTRAN, kVoxCellMonitorCellTypeServing);
-    Dictionary* const node = dictionary();
-    for (const Cell& cell : *cells)
-        if (cell.kind == serving)
-            writeCellFields(node, cell, knownFields);
+void UTRANServingCellInfo::trace() const {
+    logLine(LogPriority::Warning, "Serving Cell Info");
 }
+
+const CellTable& UTRANServingCellInfo::cellTable() const {
+    return knownCells;
+}
+
+void UTRANServingCellInfo::unknownCode(std::uint32_t) const {}
+
+void UTRANServingCellInfo::noCells() const {} // without the line that other sections write
 
 } // namespace velmora

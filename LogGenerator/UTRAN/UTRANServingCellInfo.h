@@ -3,22 +3,22 @@
 
 #pragma once
 
-#include "LogGenerator/Base.h"
+#include "LogGenerator/Extra/CellSection.h"
 
 namespace velmora {
 
 /// "Serving Cell Info": the serving cell's identity and access rights, from the baseband and from the
 /// telephony service, whichever reported last.
-class UTRANServingCellInfo final : public Base {
+class UTRANServingCellInfo final : public CellSection {
 public:
     [[nodiscard]] std::string_view getSectionName() const override { return "Serving Cell Info"; }
-    [[nodiscard]] std::vector<std::uint32_t> getLogCodeArray() const override { return {0xD0E2, 0xFF0001}; }
-    void updateWithData(const Data& data, std::uint32_t logCode) override;
+    [[nodiscard]] std::span<const View> views() const override;
 
 private:
-    /// 0xFF0001: every serving cell of the technology in turn, so that of several the last one stays. Where
-    /// there are no cells nothing is done.
-    void showServingCells(const Data& data) const;
+    [[nodiscard]] const CellTable& cellTable() const override;
+    void trace() const override;
+    void unknownCode(std::uint32_t logCode) const override;
+    void noCells() const override;
 };
 
 } // namespace velmora

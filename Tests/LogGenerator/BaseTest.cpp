@@ -15,25 +15,44 @@ namespace {
 using testing::ElementsAre;
 using testing::Pair;
 
+constexpr Field oneByte[] = {{"Value", u8At(0), integer("%d")}};
+constexpr Layout entry = layout(1, oneByte);
+constexpr List rows{};
+
+/// A section whose code 1 is a table, whose other codes show the record as a list, and whose records of code 2
+/// have the parts that their first byte says.
 class Probe final : public Base {
 public:
-    Probe(std::string name, std::vector<std::uint32_t> codes)
-        : _name(std::move(name)), _codes(std::move(codes)) {}
+    Probe(std::string name, const std::vector<std::uint32_t>& codes) : _name(std::move(name)) {
+        for (const std::uint32_t code : codes)
+            _views.push_back(code == 1 ? View(code, entry) : View(code, std::size_t{0}));
+    }
     std::string_view getSectionName() const override { return _name; }
-    std::vector<std::uint32_t> getLogCodeArray() const override { return _codes; }
-    void updateWithData(const Data&, std::uint32_t) override {}
+    std::span<const View> views() const override { return _views; }
+    void decode(const View& view, const Record& record, FieldVisitor& visitor) const override {
+        static constexpr Field low{"Low", computed, integer("%d")};
+        static constexpr Field high{"High", computed, integer("%d")};
+        if (view.code == 2) {
+            if ((record.u8(0) & 1) != 0)
+                visitor.number(low, record.u8(1));
+            if ((record.u8(0) & 2) != 0)
+                visitor.number(high, record.u8(1));
+        } else if (view.table) {
+            Base::decode(view, record, visitor);
+        } else {
+            visitor.rows(rows, CountedList(record, 0, 1, record.size()), entry);
+        }
+    }
 
-    using Base::array;
-    using Base::clearElements;
-    using Base::dictionary;
-    using Base::replaceElements;
-    using Base::rows;
-    using Base::setText;
-    using Base::show;
+    using Base::reportMissingEntries;
 
 private:
+    KeptRecords::Parts partsOf(const View& view, const Record& record) const override {
+        return view.code == 2 ? record.u8(0) : 1;
+    }
+
     std::string _name;
-    std::vector<std::uint32_t> _codes;
+    std::vector<View> _views;
 };
 
 TEST(BaseTest, RegistersUnderItsNameAndEachCode) {
@@ -70,28 +89,77 @@ TEST(BaseTest, SecondSectionOfANameReplacesTheFirst) {
 }
 
 TEST(BaseTest, NodeIsReferredToNotOwned) {
-    Probe probe("RRC Info", {});
+    Probe probe("RRC Info", {1});
     const CapturedLog log;
     DictionaryRef node = makeDictionary();
     probe.updateSectionRef(node);
     EXPECT_THAT(log.lines(), ElementsAre(CapturedLog::Line{LogPriority::Warning, "RRC Info"}));
-    probe.setText("State", "Idle");
-    EXPECT_EQ((*node)["State"], Value("Idle"));
-    EXPECT_EQ(probe.array(), nullptr);
+    EXPECT_EQ(probe.node().asDictionary(), node.get());
     node.reset();
-    EXPECT_EQ(probe.dictionary(), nullptr);
-    probe.setText("State", "Gone"); // goes nowhere
+    EXPECT_TRUE(probe.node().isNone());
+    probe.updateWithData(hex("09"), 1); // goes nowhere
+    EXPECT_TRUE(probe.node().isNone());
 }
 
-TEST(BaseTest, WithoutANodeAllWritingGoesNowhere) {
-    Probe probe("X", {});
-    probe.setText("A", "1");
-    probe.clearElements();
-    probe.replaceElements(Array{"1"});
+TEST(BaseTest, ARecordWithoutANodeIsNotShownLater) {
+    Probe probe("X", {1});
+    probe.updateWithData(hex("09"), 1);
     probe.updateSectionRef("a string is no node");
-    probe.setText("A", "1");
-    EXPECT_EQ(probe.dictionary(), nullptr);
-    EXPECT_EQ(probe.array(), nullptr);
+    probe.updateWithData(hex("09"), 1);
+    const DictionaryRef node = makeDictionary();
+    probe.updateSectionRef(node);
+    EXPECT_TRUE(probe.node().asDictionary()->empty());
+}
+
+TEST(BaseTest, LatestRecordIsWrittenWhenTheNodeIsAskedFor) {
+    Probe probe("X", {1});
+    const DictionaryRef node = makeDictionary();
+    probe.updateSectionRef(node);
+    probe.updateWithData(hex("01"), 1); // settles the order of the keys
+    EXPECT_EQ((*node)["Value"], Value("1"));
+    probe.updateWithData(hex("02"), 1);
+    probe.updateWithData(hex("03"), 1);
+    EXPECT_EQ((*node)["Value"], Value("1"));
+    EXPECT_EQ((*probe.node().asDictionary())["Value"], Value("3"));
+    EXPECT_EQ((*node)["Value"], Value("3"));
+}
+
+TEST(BaseTest, ANodeGetsItsRecordsBeforeAnotherTakesItsPlace) {
+    Probe probe("X", {1});
+    const DictionaryRef first = makeDictionary();
+    const DictionaryRef second = makeDictionary();
+    probe.updateSectionRef(first);
+    probe.updateWithData(hex("01"), 1);
+    probe.updateWithData(hex("02"), 1);
+    probe.updateSectionRef(second);
+    EXPECT_EQ((*first)["Value"], Value("2"));
+    EXPECT_TRUE(probe.node().asDictionary()->empty());
+    probe.updateWithData(hex("03"), 1);
+    EXPECT_EQ((*second)["Value"], Value("3"));
+}
+
+TEST(BaseTest, ARecordThatLacksPartsDoesNotReplaceOneThatHasThem) {
+    Probe probe("X", {2});
+    const DictionaryRef node = makeDictionary();
+    probe.updateSectionRef(node);
+    probe.updateWithData(hex("03 01"), 2);
+    probe.updateWithData(hex("03 02"), 2);
+    probe.updateWithData(hex("02 03"), 2);
+    const Dictionary& shown = *probe.node().asDictionary();
+    EXPECT_EQ(shown["Low"], Value("2"));
+    EXPECT_EQ(shown["High"], Value("3"));
+}
+
+TEST(BaseTest, OfAListTheLatestRecordCountsWhateverItsCode) {
+    Probe probe("X", {3, 4});
+    const ArrayRef node = makeArray();
+    probe.updateSectionRef(node);
+    for (const std::uint32_t code : {3U, 4U}) // both have been written once
+        probe.updateWithData(hex("00"), code);
+    probe.updateWithData(hex("01 02"), 3);
+    probe.updateWithData(hex("05"), 4);
+    ASSERT_EQ(probe.node().asArray()->size(), 1U);
+    EXPECT_EQ((*(*node)[0].asDictionary())["Value"], Value("5"));
 }
 
 TEST(BaseTest, ArraysAreRewrittenInPlace) {
@@ -106,35 +174,28 @@ TEST(BaseTest, ArraysAreRewrittenInPlace) {
     EXPECT_TRUE(node->empty());
 }
 
-constexpr Field oneByte[] = {{"Value", u8At(0), integer("%d")}};
-constexpr Layout entry = layout(1, oneByte);
-
-TEST(BaseTest, RowsEndWithTheRecordAndSayWhatIsMissing) {
+TEST(BaseTest, MissingEntriesAreReported) {
     const CapturedLog log;
     const Data data = hex("05 06");
-    const Array rows = Probe::rows(CountedList(Record(data), 0, 1, 3), entry, 0x7150);
-    ASSERT_EQ(rows.size(), 2u);
-    EXPECT_EQ((*rows[1].asDictionary())["Value"], Value("6"));
+    Probe::reportMissingEntries(CountedList(Record(data), 0, 1, 2), 0x7150);
+    EXPECT_THAT(log.lines(), ElementsAre());
+    Probe::reportMissingEntries(CountedList(Record(data), 0, 1, 3), 0x7150);
     EXPECT_THAT(log.lines(),
                 ElementsAre(CapturedLog::Line{LogPriority::Error, "Record 0x7150: 2 of 3 entries"}));
 }
 
-TEST(BaseTest, RowsThatAreAllThereSayNothing) {
-    const CapturedLog log;
-    const Data data = hex("05 06");
-    EXPECT_EQ(Probe::rows(CountedList(Record(data), 0, 1, 2), entry, 0x7150).size(), 2u);
-    EXPECT_THAT(log.lines(), ElementsAre());
-}
-
-TEST(BaseTest, ShowLeavesAShortRecordAlone) {
-    Probe probe("X", {});
+TEST(BaseTest, ShortRecordsAndUnknownCodesLeaveTheNodeAlone) {
+    Probe probe("X", {1});
     const DictionaryRef node = makeDictionary();
     probe.updateSectionRef(node);
-    const Data empty;
-    EXPECT_FALSE(probe.show(Record(empty), entry));
-    EXPECT_TRUE(node->empty());
-    EXPECT_TRUE(probe.show(Record(hex("09")), entry));
-    EXPECT_EQ((*node)["Value"], Value("9"));
+    const CapturedLog log;
+    probe.updateWithData(Data(), 1);
+    probe.updateWithData(hex("09"), 7);
+    EXPECT_TRUE(probe.node().asDictionary()->empty());
+    EXPECT_THAT(log.lines(),
+                ElementsAre(CapturedLog::Line{LogPriority::Warning, "X"},
+                            CapturedLog::Line{LogPriority::Warning, "X"},
+                            CapturedLog::Line{LogPriority::Error, "Received an unknown log message: 7"}));
 }
 
 struct EcNo {

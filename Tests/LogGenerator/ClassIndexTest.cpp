@@ -24,14 +24,9 @@ using testing::UnorderedElementsAre;
 
 class SmallIndex final : public ClassIndex {
 public:
-    SmallIndex() {
-        create(sim);
-        create(contexts);
-        create(circuits);
-    }
-    std::unique_ptr<SimInfo> sim;
-    std::unique_ptr<PDPContextList> contexts;
-    std::unique_ptr<ProcessCS> circuits;
+    Held<SimInfo> sim{*this};
+    Held<PDPContextList> contexts{*this};
+    Held<ProcessCS> circuits{*this};
 };
 
 TEST(ClassIndexTest, FindsSectionsByNameAndCode) {
@@ -48,8 +43,7 @@ TEST(ClassIndexTest, FindsSectionsByNameAndCode) {
 
 class SingleIndex final : public ClassIndex {
 public:
-    SingleIndex() { create(sim); }
-    std::unique_ptr<SimInfo> sim;
+    Held<SimInfo> sim{*this};
 };
 
 TEST(ClassIndexTest, NobodyWantsAnotherCodeHoweverFewThereAre) {

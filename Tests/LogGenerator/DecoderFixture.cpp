@@ -36,8 +36,8 @@ LogLines DecoderFixture::update(const Data& record) {
     return log.lines();
 }
 
-std::string DecoderFixture::node(std::string_view group, std::string_view section) const {
-    return shown((*(*state["Display"].asDictionary())[group].asDictionary())[section]);
+std::string DecoderFixture::node(std::string_view group, std::string_view section) {
+    return shown((*(*generator->display(state).asDictionary())[group].asDictionary())[section]);
 }
 
 void DecoderFixture::expectStartCommand(const std::vector<std::int64_t>& codes) const {

@@ -29,9 +29,9 @@ protected:
 
     /// Decodes the record; gives the log lines.
     LogLines update(const Data& record);
-    [[nodiscard]] std::string display() const { return shown(state["Display"]); }
+    [[nodiscard]] std::string display() { return shown(generator->display(state)); }
     /// A section's node as `shown` gives it.
-    [[nodiscard]] std::string node(std::string_view group, std::string_view section) const;
+    [[nodiscard]] std::string node(std::string_view group, std::string_view section);
 
     /// Expects a start command that asks for these codes, ascending, of the baseband's stream and for the
     /// three of the extra one.

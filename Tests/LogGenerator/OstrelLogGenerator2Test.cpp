@@ -28,20 +28,28 @@ public:
         std::uint32_t code;
     };
 
-    Listener(std::string name, std::vector<std::uint32_t> codes)
-        : _name(std::move(name)), _codes(std::move(codes)) {}
+    Listener(std::string name, const std::vector<std::uint32_t>& codes) : _name(std::move(name)) {
+        for (const std::uint32_t code : codes)
+            _views.push_back({code, std::size_t{0}});
+    }
     std::string_view getSectionName() const override { return _name; }
-    std::vector<std::uint32_t> getLogCodeArray() const override { return _codes; }
+    std::span<const View> views() const override { return _views; }
     void updateWithData(const Data& data, std::uint32_t code) override {
         calls.push_back({data, code});
-        setText("Length", std::to_string(data.size()));
+        Base::updateWithData(data, code);
+    }
+    void decode(const View&, const Record& record, FieldVisitor& visitor) const override {
+        static constexpr Field length{"Length", computed, integer("%d")};
+        visitor.number(length, static_cast<std::int64_t>(record.size()));
     }
 
     std::vector<Call> calls;
 
 private:
+    void trace() const override {}
+
     std::string _name;
-    std::vector<std::uint32_t> _codes;
+    std::vector<View> _views;
 };
 
 class ListenerIndex final : public ClassIndex {
@@ -72,7 +80,7 @@ protected:
         static_cast<void>(generator.generateLogUsingState(state));
         return *state["DisplayState"].asData();
     }
-    [[nodiscard]] const Dictionary& display() const { return *state["Display"].asDictionary(); }
+    [[nodiscard]] const Dictionary& display() { return *generator.display(state).asDictionary(); }
 
     CapturedLog log;
     FakeClock clock;
@@ -391,6 +399,7 @@ TEST_F(TemplateTest, NewDecoderGoesOnInTheDisplayOfTheEarlierOne) {
     EXPECT_EQ(next.getDisplayFromState(state).asDictionary(), shown);
     next.updateState(state, record(0xD0E0, ""));
     EXPECT_EQ(&display(), shown);
+    static_cast<void>(next.display(state));
     EXPECT_EQ((*(*display()["Radio"].asDictionary())["RRC Info"].asDictionary())["Length"], Value("13"));
 }
 
@@ -400,6 +409,7 @@ TEST_F(TemplateTest, NewDecoderFindsItsNodesWithinAnArrayToo) {
                              Dictionary{{"Radios", std::make_shared<Array>(Array{std::make_shared<Dictionary>(
                                                        Dictionary{{"RRC Info", node}})})}}));
     update(record(0xD0E0, "01 02"));
+    static_cast<void>(display());
     EXPECT_EQ((*node)["Length"], Value("15")); // a header of 13 bytes and 2
 }
 

@@ -3,6 +3,7 @@
 
 #include "Tests/LogGenerator/SectionHarness.h"
 
+#include "LogMessages/LogMessage.h"
 #include "Tests/Support/Hex.h"
 
 #include <gtest/gtest.h>
@@ -45,7 +46,7 @@ SectionHarness& SectionHarness::update(const Data& record, std::uint32_t logCode
 }
 
 std::string SectionHarness::text(std::string_view label) const {
-    const std::string* text = (*_node.asDictionary())[label].asString();
+    const std::string* text = (*value().asDictionary())[label].asString();
     return text ? *text : "(none)";
 }
 
@@ -59,7 +60,7 @@ std::vector<std::string> SectionHarness::errors() const {
 
 std::uint32_t logCodeOf(const Data& record) {
     const Record header(record);
-    return header.u16(3) + (header.u8(0) == 0xFF ? firstExtraCode : 0);
+    return header.u16(3) + (header.u8(0) == 0xFF ? LogMessage::firstExtraCode : 0);
 }
 
 Data withByte(const Data& record, std::size_t offset, std::uint8_t value) {

@@ -39,10 +39,13 @@ public:
     SectionHarness& update(const Data& record, std::uint32_t logCode);
 
     /// The node as `shown` gives it.
-    [[nodiscard]] std::string node() const { return shown(_node); }
+    [[nodiscard]] std::string node() const { return shown(value()); }
     /// The text under a label of a dictionary node; "(none)" where there is none.
     [[nodiscard]] std::string text(std::string_view label) const;
-    [[nodiscard]] const Value& value() const { return _node; }
+    [[nodiscard]] const Value& value() const {
+        _section->writeNode();
+        return _node;
+    }
 
     /// The log lines of the last update.
     [[nodiscard]] const LogLines& lines() const { return _lines; }

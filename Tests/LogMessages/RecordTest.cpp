@@ -60,6 +60,7 @@ TEST_P(CountedListSizeTest, KnowsHowManyEntriesLieInside) {
     const CountedList list(Record(Bytes(bytes)), 4, 3, GetParam().count); // three bytes each, from 4 on
     EXPECT_EQ(list.count(), GetParam().count);
     EXPECT_EQ(list.whole(), GetParam().whole);
+    EXPECT_EQ(list.isWhole(), list.whole() == list.count());
 }
 
 INSTANTIATE_TEST_SUITE_P(

@@ -166,36 +166,78 @@ TEST(Data, PartsShareTheBuffer) {
     EXPECT_NE(Data::copyOf(part.bytes()).bytes().data(), part.bytes().data());
 }
 
-TEST(Dictionary, TextsOfNewKeysAreFoundHoweverManyThereAre) {
-    Dictionary dictionary;
-    dictionary.reserve(40);
-    for (int i = 0; i < 40; ++i) {
-        dictionary.addText("key " + std::to_string(i), std::to_string(i));
-        EXPECT_EQ(dictionary["key 0"], Value("0"));
-        EXPECT_EQ(dictionary["key " + std::to_string(i)], Value(std::to_string(i)));
-    }
-    EXPECT_EQ(dictionary.size(), 40u);
-    EXPECT_FALSE(dictionary.contains("key 40"));
-    dictionary.setText("key 7", "seven");
-    EXPECT_EQ(dictionary["key 7"], Value("seven"));
-    EXPECT_EQ(dictionary.size(), 40u);
+TEST(Dictionary, SlotsInOrderReplaceWhatStoodThere) {
+    Dictionary dictionary{{"A", 1}, {"B", 2}, {"C", 3}};
+    dictionary.slotAt(0, "A").setText("a");
+    EXPECT_EQ(keysOf(dictionary), (std::vector<std::string>{"A", "B", "C"}));
+    dictionary.slotAt(1, "C").setText("c");
+    EXPECT_EQ(keysOf(dictionary), (std::vector<std::string>{"A", "C"}));
+    dictionary.slotAt(2, "D") = 4;
+    EXPECT_EQ(dictionary["A"], Value("a"));
+    EXPECT_EQ(dictionary["C"], Value("c"));
+    EXPECT_EQ(dictionary["D"], Value(4));
+    dictionary.truncate(1);
+    EXPECT_EQ(keysOf(dictionary), (std::vector<std::string>{"A"}));
+    dictionary.truncate(5);
+    EXPECT_EQ(dictionary.size(), 1u);
     const Value copy = Value(std::make_shared<Dictionary>(dictionary)).copy();
-    EXPECT_THROW(copy.asDictionary()->addText("key 40", ""), std::logic_error);
+    EXPECT_THROW(static_cast<void>(copy.asDictionary()->slotAt(0, "A")), std::logic_error);
+    EXPECT_THROW(copy.asDictionary()->truncate(0), std::logic_error);
 }
 
-TEST(Dictionary, AKeyIsFoundByItsTextWhereverThatStandsInMemory) {
-    Dictionary dictionary{{"A", 1}, {"B", 2}, {"", 3}};
-    std::string key = "A"; // the same place in memory with another text each time
-    for (const auto& [text, wanted] : {std::pair("A", 1), {"B", 2}, {"C", 0}, {"", 3}, {"A", 1}}) {
-        key = text;
-        const Value* found = dictionary.find(key);
-        EXPECT_EQ(found ? *found : Value(0), Value(wanted)) << text;
+TEST(Dictionary, ManySlotsInOrderAreFound) {
+    Dictionary dictionary;
+    for (int round = 0; round < 2; ++round) {
+        for (std::size_t i = 0; i < 40; ++i)
+            dictionary.slotAt(i, "key " + std::to_string(i)).setText(std::to_string(round));
+        for (int i = 0; i < 40; ++i)
+            EXPECT_EQ(dictionary["key " + std::to_string(i)], Value(std::to_string(round)));
+        EXPECT_FALSE(dictionary.contains("key 40"));
     }
-    dictionary.remove("A");
-    key = "B";
-    EXPECT_EQ(dictionary[key], Value(2));
-    key = "A";
-    EXPECT_EQ(dictionary.find(key), nullptr);
+    dictionary.truncate(20);
+    EXPECT_TRUE(dictionary.contains("key 19"));
+    EXPECT_FALSE(dictionary.contains("key 20"));
+}
+
+// A key is looked for first where the one set before it ended; that is no more than a guess.
+TEST(Dictionary, KeysAreFoundInWhateverOrderTheyAreSet) {
+    Dictionary dictionary{{"A", 1}, {"B", 2}, {"C", 3}};
+    for (const char* key : {"C", "A", "B", "B", "A", "C", "C", "B", "A"}) {
+        dictionary.setText(key, key);
+        EXPECT_EQ(dictionary[key], Value(key));
+    }
+    EXPECT_EQ(keysOf(dictionary), (std::vector<std::string>{"A", "B", "C"}));
+    dictionary.set("B", 1);
+    dictionary.remove("C");
+    dictionary.set("C", 2);
+    dictionary.set("A", 3);
+    EXPECT_EQ(dictionary.size(), 3u);
+    EXPECT_EQ(dictionary["C"], Value(2));
+}
+
+TEST(Array, SlotsInOrderGrowIt) {
+    Array array{1, 2, 3};
+    array.slot(1) = "two";
+    array.slot(3) = 4;
+    ASSERT_EQ(array.size(), 4U);
+    EXPECT_EQ(array[1], Value("two"));
+    EXPECT_EQ(array[3], Value(4));
+    array.truncate(1);
+    EXPECT_EQ(array.size(), 1U);
+    array.truncate(7);
+    EXPECT_EQ(array.size(), 1U);
+    const Value copy = Value(std::make_shared<Array>(array)).copy();
+    EXPECT_THROW(static_cast<void>(copy.asArray()->slot(0)), std::logic_error);
+    EXPECT_THROW(copy.asArray()->truncate(0), std::logic_error);
+}
+
+TEST(Value, KnowsWhetherItIsTheOnlyReference) {
+    Value list = makeArray();
+    EXPECT_TRUE(list.isOnlyReference());
+    const Value another = list;
+    EXPECT_FALSE(list.isOnlyReference());
+    EXPECT_TRUE(Value(makeDictionary()).isOnlyReference());
+    EXPECT_FALSE(Value("text").isOnlyReference());
 }
 
 } // namespace

@@ -73,8 +73,7 @@ public:
 
     void decode(const Data& message) { _decoder->updateState(_state, message); }
     void look() {
-        if (const Value* display = _state.find("Display"))
-            collectShown(*display, "", _shown);
+        collectShown(_decoder->display(_state), "", _shown);
     }
     [[nodiscard]] const std::set<std::string>& shown() const { return _shown; }
 

@@ -105,24 +105,38 @@ Result<bool> toDLFLog(MessageReader& reader, const Conversion& conversion, int d
 /// Waits for what a snapshot saves.
 class SaveContents final : public DecodingObserver {
 public:
+    /// `refreshes`: how many there will be, where that is known.
+    explicit SaveContents(std::optional<std::uint64_t> refreshes) : _expected(refreshes) {}
+
     /// Of the last refresh; absent where there was none.
     std::optional<Time> tick;
     ArrayRef contents;
 
-    [[nodiscard]] bool wantsHistory() const override { return true; }
+    [[nodiscard]] bool wantsHistory(std::uint64_t refreshes) const override {
+        // One more than the history holds, so that all its entries begin with a refresh.
+        constexpr std::uint64_t kept = 6;
+        return !_expected || refreshes + kept >= *_expected;
+    }
+    [[nodiscard]] bool wantsEveryRefresh() const override { return false; }
     void refreshed(Time refreshTick, const Decoded&) override { tick = refreshTick; }
     void ended(const LogGenerator& decoder, const Dictionary& state) override {
         contents = decoder.getSaveContentsFromState(state);
     }
+
+private:
+    std::optional<std::uint64_t> _expected;
 };
 
 Result<bool> toSnapshot(MessageReader& reader, const Conversion& conversion, int descriptor,
                         WorkContext& context) {
-    SaveContents saved;
+    SaveContents saved(conversion.refreshes);
     DecodingRequest request;
     request.technology = conversion.technology;
-    if (const Result<Decoded> decoded = decodeMessages(reader, request, context, saved); !decoded)
+    const Result<Decoded> decoded = decodeMessages(reader, request, context, saved);
+    if (!decoded)
         return Failure{conversion.title + ": " + decoded.reason()};
+    if (conversion.refreshes && decoded->refreshes < *conversion.refreshes)
+        return Failure{conversion.title + ": became shorter while it was read"};
     // Without a refresh there is no time but now.
     const Time timeStamp = saved.tick ? *saved.tick : MachineClock().now();
     const Result<std::string> list =

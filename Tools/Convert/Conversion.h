@@ -9,6 +9,8 @@
 
 #include <memory>
 #include <optional>
+#include <cstdint>
+#include <optional>
 #include <string>
 #include <string_view>
 
@@ -35,6 +37,9 @@ struct Conversion {
     std::string name;        ///< of the output
     std::string technology;  ///< before the one that the input names; empty for that one
     std::string description; ///< a snapshot's
+    /// How many refreshes the input takes (see countRefreshes), where it could be read before: a snapshot
+    /// needs the history of the last of them only, which makes it a good deal faster.
+    std::optional<std::uint64_t> refreshes;
 };
 
 /// Reads messages to their end and writes them to an open file, which stays the caller's and gets nothing but

@@ -7,6 +7,7 @@
 #include "Recording/OpenMessages.h"
 #include "Tools/Convert/Conversion.h"
 #include "Tools/Decode/Decoding.h"
+#include "Tools/Decode/Refreshes.h"
 #include "Tools/ExitStatus.h"
 #include "Tools/Report.h"
 
@@ -14,6 +15,7 @@
 #include <climits>
 #include <csignal>
 #include <memory>
+#include <optional>
 #include <string_view>
 
 #include <sys/stat.h>
@@ -75,6 +77,15 @@ std::string whyRefused(const ConvertOptions& options) {
     return options.force ? std::string() : alreadyThere(options.out);
 }
 
+/// How many refreshes the file takes; none where it is no regular file, which can be read but once.
+std::optional<std::uint64_t> refreshesOf(const std::string& file) {
+    struct stat status = {};
+    if (file == "-" || ::stat(file.c_str(), &status) != 0 || !S_ISREG(status.st_mode))
+        return std::nullopt;
+    const Result<std::unique_ptr<MessageReader>> reader = openMessages(file);
+    return reader ? std::optional(countRefreshes(**reader)) : std::nullopt;
+}
+
 /// Whether all of the input is in the output now.
 bool convert(const ConvertOptions& options, MessageReader& reader, const std::string& title) {
     // Before the draft, so that no moment is left in which memory that cannot be had would leave one behind.
@@ -96,6 +107,8 @@ bool convert(const ConvertOptions& options, MessageReader& reader, const std::st
     conversion.name = options.out;
     conversion.technology = options.technology;
     conversion.description = options.description;
+    if (conversion.form == FileForm::Snapshot)
+        conversion.refreshes = refreshesOf(options.file);
     const Result<bool> converted = convertMessages(reader, conversion, draft->descriptor(), context);
     if (!converted) {
         report(converted.reason());

@@ -17,9 +17,9 @@ CSVRows::CSVRows(Output& output, bool isLive, const DecodeOptions& options, cons
     _fileCell = cell.view();
 }
 
-void CSVRows::messageDecoded(const LoggedMessage& message, const Dictionary& state) {
+void CSVRows::messageDecoded(const LoggedMessage& message, LogGenerator& decoder, Dictionary& state) {
     if (_options.every == DecodeOptions::Every::Message)
-        writeRow(message.time, state["Display"]);
+        writeRow(message.time, decoder.display(state));
 }
 
 void CSVRows::refreshed(Time tick, const Decoded& decoded) {

@@ -14,7 +14,10 @@ namespace velmora {
 class CSVRows final : public LineWriter {
 public:
     CSVRows(Output& output, bool isLive, const DecodeOptions& options, const std::string& file);
-    void messageDecoded(const LoggedMessage& message, const Dictionary& state) override;
+    [[nodiscard]] bool wantsEveryRefresh() const override {
+        return _options.every == DecodeOptions::Every::Refresh;
+    }
+    void messageDecoded(const LoggedMessage& message, LogGenerator& decoder, Dictionary& state) override;
     void refreshed(Time tick, const Decoded& decoded) override;
 
     /// The first row: "time", "file" where there are several, the paths as they were given.

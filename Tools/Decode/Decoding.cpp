@@ -7,6 +7,7 @@
 #include "Tools/Decode/DecodeProgress.h"
 #include "Tools/Decode/NotedResources.h"
 #include "Tools/Decode/RecordedTime.h"
+#include "Tools/Decode/Refreshes.h"
 #include "Tools/Report.h"
 #include "Tools/Technologies.h"
 
@@ -25,33 +26,39 @@ Result<Decoded> decodeMessages(MessageReader& reader, const DecodingRequest& req
     if (!decoder)
         return Failure{decoder.reason() + (named.empty() ? "; --technology supplies it" : "")};
 
-    (*decoder)->setKeepsHistory(observer.wantsHistory());
+    bool keepsHistory = observer.wantsHistory(0);
+    (*decoder)->setKeepsHistory(keepsHistory);
+    const bool wantsEveryRefresh = observer.wantsEveryRefresh();
 
     const NotedResources resources;
     Decoded decoded;
     decoded.technology = shortTechnologyName(named);
     Dictionary state;
-    RecordedTicks ticks;
-    bool fileTellsRefreshes = false; // instead of the ticks
-    bool isRefreshed = true;         // since the latest wanted message
+    Refreshes refreshes;
     const auto refresh = [&](Time tick) {
-        isRefreshed = true;
+        refreshes.done();
+        decoded.refreshes = refreshes.count();
         clock.setNow(tick);
-        decoded.display = (*decoder)->generateLogUsingState(state);
+        // A refresh that nobody sees does nothing but, where there is no display yet, log why.
+        if (keepsHistory || wantsEveryRefresh || !state.contains("Display"))
+            decoded.display = (*decoder)->generateLogUsingState(state);
         observer.refreshed(tick, decoded);
+        if (observer.wantsHistory(refreshes.count()) != keepsHistory) {
+            keepsHistory = !keepsHistory;
+            (*decoder)->setKeepsHistory(keepsHistory);
+        }
     };
     MessageEffects* const effects = observer.effects();
     const Time first = message ? message->time : Time();
     const auto decode = [&](const LoggedMessage& logged) {
         if (request.progress)
             request.progress->at(logged.offset);
-        fileTellsRefreshes = fileTellsRefreshes || logged.refresh;
         if (!request.range.contains(logged.time, first)) {
-            if (logged.refresh && !isRefreshed)
-                refresh(*logged.refresh);
+            if (const std::optional<Time> tick = refreshes.afterSkipped(logged))
+                refresh(*tick);
             return;
         }
-        if (const std::optional<Time> tick = ticks.before(logged.time); tick && !fileTellsRefreshes)
+        if (const std::optional<Time> tick = refreshes.before(logged))
             refresh(*tick);
         context.atRecord(logged.number, logged.offset);
         clock.setNow(logged.time);
@@ -61,10 +68,9 @@ Result<Decoded> decodeMessages(MessageReader& reader, const DecodingRequest& req
         else
             (*decoder)->updateState(state, logged.message);
         ++decoded.messages;
-        isRefreshed = false;
-        observer.messageDecoded(logged, state);
-        if (logged.refresh)
-            refresh(*logged.refresh);
+        observer.messageDecoded(logged, **decoder, state);
+        if (const std::optional<Time> tick = refreshes.after(logged))
+            refresh(*tick);
     };
     bool more = message.has_value();
     if (more && !observer.hasEnough())
@@ -77,8 +83,10 @@ Result<Decoded> decodeMessages(MessageReader& reader, const DecodingRequest& req
         if (more)
             decode(*next);
     }
-    if (const std::optional<Time> tick = ticks.last(); tick && !isRefreshed)
+    if (const std::optional<Time> tick = refreshes.last())
         refresh(*tick);
+    if (refreshes.count() != 0 && !keepsHistory && !wantsEveryRefresh)
+        decoded.display = (*decoder)->display(state);
     observer.ended(**decoder, state);
     if (!resources.failure().empty())
         return Failure{"decoded without its template: " + resources.failure()};

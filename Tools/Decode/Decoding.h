@@ -23,6 +23,7 @@ class WorkContext;
 struct Decoded {
     std::string technology; ///< the short name
     std::uint64_t messages = 0;
+    std::uint64_t refreshes = 0;
     Value display; ///< as it stands after the latest refresh; none where there was nothing to show
 };
 
@@ -37,11 +38,14 @@ public:
     /// Who is to be told what each message concerned; asked once. Null, without which decoding is faster, for
     /// nobody.
     [[nodiscard]] virtual MessageEffects* effects() { return nullptr; }
-    /// Whether the decoder keeps its history, for what a snapshot saves; asked once. Decoding without is
-    /// faster.
-    [[nodiscard]] virtual bool wantsHistory() const { return false; }
-    /// A wanted message has been decoded.
-    virtual void messageDecoded(const LoggedMessage&, const Dictionary& /*state*/) {}
+    /// Whether the decoder keeps its history, for what a snapshot saves; asked at the beginning and after each
+    /// refresh. Decoding without is faster.
+    [[nodiscard]] virtual bool wantsHistory(std::uint64_t /*refreshes*/) const { return false; }
+    /// Whether the display is wanted at each refresh, or only at the last one; asked once. Decoding without is
+    /// faster, since text is made only of what is asked for.
+    [[nodiscard]] virtual bool wantsEveryRefresh() const { return true; }
+    /// A wanted message has been decoded; `decoder.display(state)` is the display as it then stands.
+    virtual void messageDecoded(const LoggedMessage&, LogGenerator& /*decoder*/, Dictionary& /*state*/) {}
     /// The display has been refreshed; `decoded` holds it, and what was decoded up to here.
     virtual void refreshed(Time /*tick*/, const Decoded& /*decoded*/) {}
     /// The last refresh has been; the state is as the decoder leaves it.

@@ -15,6 +15,7 @@ class FinalDisplay final : public DecodeWriter {
 public:
     FinalDisplay(Output& output, const DecodeOptions& options, std::string heading)
         : DecodeWriter(output), _options(options), _heading(std::move(heading)) {}
+    [[nodiscard]] bool wantsEveryRefresh() const override { return false; }
     void finish(const Decoded& decoded) override;
 
     /// Each ends in a line feed unless it is empty.

@@ -28,7 +28,8 @@ public:
     MessageLines(Output& output, bool isLive, const std::string& file);
     void messageComes(const LoggedMessage& message) override { _moment = message.time; }
     [[nodiscard]] MessageEffects* effects() override { return this; }
-    void messageDecoded(const LoggedMessage& message, const Dictionary& state) override;
+    [[nodiscard]] bool wantsEveryRefresh() const override { return false; }
+    void messageDecoded(const LoggedMessage& message, LogGenerator& decoder, Dictionary& state) override;
 
 private:
     void sections(std::optional<std::uint32_t> code) override;

@@ -3,8 +3,6 @@
 
 #include "LogGenerator/C2K/EVDO/DataRate.h"
 
-#include <array>
-#include <cstring>
 #include <optional>
 
 namespace velmora::C2K {
@@ -18,24 +16,10 @@ std::optional<std::int64_t> integerOf(const Value& value) {
     return integer ? std::optional(*integer) : std::nullopt;
 }
 
-/// From one record to a later one.
-struct Growth {
-    std::int64_t bits = 0;
-    std::int64_t steps = 0;
-};
-
-Value rateOf(Bytes bytes, const void*) {
-    Growth growth;
-    std::memcpy(&growth, bytes.data(), sizeof growth);
-    return NumberText("%.2f kbps",
-                      static_cast<double>(growth.bits) / (static_cast<double>(growth.steps) * bitsPerKilobit))
-        .text();
-}
-
 } // namespace
 
-void updateDataRate(const DataRateKeys& keys, std::uint32_t sequence, std::uint64_t sent, Dictionary& state,
-                    const Publisher& publisher) {
+std::optional<Reading> updateDataRate(const DataRateKeys& keys, std::uint32_t sequence, std::uint64_t sent,
+                                      Dictionary& state) {
     // Absent where the state never had a display; then the copies go nowhere.
     const DictionaryRef extra = state["ExtraInfo"].dictionaryRef();
     const auto note = [&extra](std::string_view key, std::int64_t number) {
@@ -45,25 +29,30 @@ void updateDataRate(const DataRateKeys& keys, std::uint32_t sequence, std::uint6
 
     const std::optional<std::int64_t> earlierSequence = integerOf(state[keys.sequence]);
     const std::optional<std::int64_t> earlierSent = integerOf(state[keys.sent]);
+    std::optional<Reading> reading;
     if (earlierSequence && earlierSent) {
         const auto steps = static_cast<std::int32_t>(sequence - static_cast<std::uint32_t>(*earlierSequence));
-        if (steps >= 1) {
-            const Growth growth{static_cast<std::int64_t>(sent - static_cast<std::uint64_t>(*earlierSent)),
-                                steps};
-            std::array<std::uint8_t, sizeof growth> bytes;
-            std::memcpy(bytes.data(), &growth, sizeof growth);
-            publisher.publishLater(keys.value, rateOf, nullptr, bytes);
-        }
+        const auto bits = static_cast<std::int64_t>(sent - static_cast<std::uint64_t>(*earlierSent));
+        if (steps >= 1)
+            reading = Reading{Record(Bytes()), static_cast<double>(bits) / (steps * bitsPerKilobit)};
         note(keys.sequence2, *earlierSequence);
         note(keys.sent2, *earlierSent);
     } else {
-        publisher.publish(keys.value, "");
+        reading = Reading{};
     }
     const auto keptSent = static_cast<std::int64_t>(sent);
     state.set(keys.sequence, sequence);
     state.set(keys.sent, keptSent);
     note(keys.sequence1, sequence);
     note(keys.sent1, keptSent);
+    return reading;
+}
+
+void visitDataRate(const Field& rate, const Reading& reading, FieldVisitor& visitor) {
+    if (reading.number)
+        visitor.real(rate, *reading.number);
+    else
+        visitor.text(rate, "");
 }
 
 } // namespace velmora::C2K

@@ -3,6 +3,7 @@
 
 #include "LogGenerator/C2K/EVDO/EVDOStatus.h"
 
+#include "LogGenerator/C2K/BandClasses.h"
 #include "LogGenerator/C2K/ValueField.h"
 #include "Platform/SystemLog.h"
 
@@ -16,26 +17,26 @@ constexpr EnumText deviceStateRows[] = {
     {0, "Inactive [0]"}, {1, "Acquisition [1]"}, {2, "Sync [2]"},
     {3, "Idle [3]"},     {4, "Access [4]"},      {5, "Connected [5]"},
 };
-constexpr NumberedTexts deviceStates(deviceStateRows, "[Reserved ", "]");
+constexpr EnumTexts deviceStates(deviceStateRows, "[Reserved ", "]");
 constexpr std::uint8_t accessState = 4;
 
 constexpr EnumText sessionStateRows[] = {
     {0, "Closed [0]"},        {1, "AMP setup [1]"}, {2, "AT-initiated neg [2]"},
     {3, "Initiated neg [3]"}, {4, "Open [4]"},
 };
-constexpr NumberedTexts sessionStates(sessionStateRows, "[Reserved ", "]");
+constexpr EnumTexts sessionStates(sessionStateRows, "[Reserved ", "]");
 
-constexpr Where deviceState = u8At(36);
+constexpr Place deviceState = u8At(36);
 
 constexpr ValueField fields[] = {
     {"kChannel", bitsAt(13, 0, 11), integer("%d")},
-    {"k1xEVDODeviceState", deviceState, deviceStates}, // second, before its place in the record
-    {"kBandClass", bitsAt(14, 3, 5), bandClasses},
+    {"k1xEVDODeviceState", deviceState, text(deviceStates)}, // second, before its place in the record
+    {"kBandClass", bitsAt(14, 3, 5), text(bandClasses)},
     {"kRxAGC0", i8At(15), integer("%+d dBm")},
-    {"kRxAGC1", i8At(16), integer("%+d dBm"), When::Connected},
-    {"kTxAGC", i8At(17), integer("%+d dBm"), When::Connected},
+    {"kRxAGC1", i8At(16), integer("%+d dBm"), Validity::WhileConnected},
+    {"kTxAGC", i8At(17), integer("%+d dBm"), Validity::WhileConnected},
     {"kServingPNOffset", u16At(18), unless(0xFFFF, "Invalid Value", integer("%d \u00D7 64chips"))},
-    {"kSessionState", u8At(37), sessionStates},
+    {"kSessionState", u8At(37), text(sessionStates)},
     {"kUATI24", bitsAt(38, 0, 24), hexadecimal()},
     {"kColorCode", u8At(41), integer("%d")},
 };
@@ -43,14 +44,18 @@ static_assert(endOf(fields, true) <= exactLength);
 
 } // namespace
 
-void EVDOStatus::parse(const Record& record, Dictionary&, const Publisher& publisher) const {
+std::optional<Reading> EVDOStatus::accept(const Record& record, Dictionary&) const {
     if (record.size() != exactLength) {
         logFormat(LogPriority::Error, "Log code 0x1183 is %u bytes long but should be %lu bytes.",
                   lengthOf(record), static_cast<unsigned long>(exactLength));
-        return;
+        return std::nullopt;
     }
+    return Reading{record};
+}
+
+void EVDOStatus::decode(const Reading& reading, FieldVisitor& visitor) const {
     // A reserved state above Connected counts as connected.
-    publishFields(publisher, record, fields, deviceState.read(record) >= accessState);
+    visitFields(fields, reading.record, deviceState.read(reading.record) >= accessState, visitor);
 }
 
 } // namespace velmora::C2K

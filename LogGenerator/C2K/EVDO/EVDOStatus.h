@@ -12,7 +12,8 @@ class EVDOStatus final : public LogCodeParser {
 public:
     [[nodiscard]] std::uint16_t logCode() const override { return 0x1183; }
     [[nodiscard]] std::string_view name() const override { return "EV-DO status"; }
-    void parse(const Record& record, Dictionary& state, const Publisher& publisher) const override;
+    [[nodiscard]] std::optional<Reading> accept(const Record& record, Dictionary& state) const override;
+    void decode(const Reading& reading, FieldVisitor& visitor) const override;
 };
 
 } // namespace velmora::C2K

@@ -3,7 +3,7 @@
 
 #include "LogGenerator/C2K/EVDO/FingerC2I.h"
 
-#include "LogGenerator/C2K/PilotList.h"
+#include "LogGenerator/C2K/PilotFields.h"
 #include "Platform/SystemLog.h"
 
 namespace velmora::C2K {
@@ -15,26 +15,16 @@ constexpr std::size_t countAt = 22;
 constexpr std::size_t fingerLength = 14;
 constexpr std::uint16_t unassigned = 0xFFFF;
 
-/// Of the entries.
-Value fingersOf(Bytes bytes, const void*) {
-    PilotList fingers;
-    const CountedList entries(Record(bytes), 0, fingerLength, bytes.size() / fingerLength);
-    for (std::size_t i = 0; i < entries.count(); ++i) {
-        const Record finger = entries[i];
-        if (const std::uint16_t pnOffset = finger.u16(0); pnOffset != unassigned)
-            fingers.add(i, pnOffset, decibelsOf512ths(finger.u16(6)));
-    }
-    return fingers.valueOrNone();
-}
+constexpr List fingerList{"kFingerC2I", List::Entries::Numbered, "(none)"};
 
 } // namespace
 
-void FingerC2I::parse(const Record& record, Dictionary&, const Publisher& publisher) const {
+std::optional<Reading> FingerC2I::accept(const Record& record, Dictionary&) const {
     constexpr auto minimum = static_cast<unsigned long>(minimumLength);
     if (record.size() < minimumLength) {
         logFormat(LogPriority::Error, "Log code 0x108a is %u bytes long but must be at least %lu bytes.",
                   lengthOf(record), minimum);
-        return;
+        return std::nullopt;
     }
     const std::size_t count = record.u8(countAt);
     if (record.size() != minimumLength + fingerLength * count) {
@@ -42,10 +32,23 @@ void FingerC2I::parse(const Record& record, Dictionary&, const Publisher& publis
         logFormat(LogPriority::Error,
                   "Log code 0x108a has bad length of %u bytes, but has %d substructs (size=%lu).",
                   lengthOf(record), static_cast<int>(count), minimum);
-        return;
+        return std::nullopt;
     }
-    publisher.publishLater("kFingerC2I", fingersOf, nullptr,
-                           record.part(minimumLength, fingerLength * count).bytes());
+    return Reading{record.part(minimumLength, fingerLength * count)};
+}
+
+void FingerC2I::decode(const Reading& reading, FieldVisitor& visitor) const {
+    const Bytes entries = reading.record.bytes();
+    const CountedList fingers(reading.record, 0, fingerLength, entries.size() / fingerLength);
+    visitor.beginList(fingerList);
+    for (std::size_t i = 0; i < fingers.count(); ++i) {
+        const Record finger = fingers[i];
+        if (const std::uint16_t pnOffset = finger.u16(0); pnOffset != unassigned) {
+            visitor.entryNumber(i, pnOffset);
+            visitor.real(pilotEnergy, decibelsOf512ths(finger.u16(6)));
+        }
+    }
+    visitor.endList();
 }
 
 } // namespace velmora::C2K

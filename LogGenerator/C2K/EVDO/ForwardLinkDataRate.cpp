@@ -25,8 +25,8 @@ constexpr std::uint32_t weights[] = {
 };
 static_assert(std::size(weights) == 56 && countersAt + 4 * std::size(weights) <= minimumLength);
 
+constexpr Field rate{"kFLDataRate", computed, real("%.2f kbps")};
 constexpr DataRateKeys keys = {
-    .value = "kFLDataRate",
     .sequence = "FLDataSeqNum",
     .sent = "FLDataSent",
     .sequence1 = "FLDataSeqNum1",
@@ -37,16 +37,20 @@ constexpr DataRateKeys keys = {
 
 } // namespace
 
-void ForwardLinkDataRate::parse(const Record& record, Dictionary& state, const Publisher& publisher) const {
+std::optional<Reading> ForwardLinkDataRate::accept(const Record& record, Dictionary& state) const {
     if (record.size() < minimumLength) {
         logFormat(LogPriority::Error, "Log code 0x1192 is %d bytes long but must be at least %ld bytes.",
                   static_cast<int>(record.size()), static_cast<long>(minimumLength));
-        return;
+        return std::nullopt;
     }
     std::uint64_t sent = 0;
     for (std::size_t i = 0; i < std::size(weights); ++i)
         sent += std::uint64_t{record.u32(countersAt + 4 * i)} * weights[i];
-    updateDataRate(keys, record.u32(sequenceAt), sent, state, publisher);
+    return updateDataRate(keys, record.u32(sequenceAt), sent, state);
+}
+
+void ForwardLinkDataRate::decode(const Reading& reading, FieldVisitor& visitor) const {
+    visitDataRate(rate, reading, visitor);
 }
 
 } // namespace velmora::C2K

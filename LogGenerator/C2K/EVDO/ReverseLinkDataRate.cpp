@@ -28,8 +28,8 @@ static_assert(std::size(weights) == 12 &&
               groupsAt[1] + 11 * sizeStride + (blocks - 1) * blockStride + 4 * countersInGroup <=
                   minimumLength);
 
+constexpr Field rate{"kRLDataRate", computed, real("%.2f kbps")};
 constexpr DataRateKeys keys = {
-    .value = "kRLDataRate",
     .sequence = "RLDataSeqNum",
     .sent = "RLDataSent",
     .sequence1 = "RLDataSeqNum1",
@@ -57,16 +57,20 @@ std::uint64_t packets(const Record& record, std::size_t size) {
 
 } // namespace
 
-void ReverseLinkDataRate::parse(const Record& record, Dictionary& state, const Publisher& publisher) const {
+std::optional<Reading> ReverseLinkDataRate::accept(const Record& record, Dictionary& state) const {
     if (record.size() < minimumLength) {
         logFormat(LogPriority::Error, "Log code 0x127e is %d bytes long but must be at least %ld bytes.",
                   static_cast<int>(record.size()), static_cast<long>(minimumLength));
-        return;
+        return std::nullopt;
     }
     std::uint64_t sent = 0;
     for (std::size_t size = 0; size < std::size(weights); ++size)
         sent += packets(record, size) * weights[size];
-    updateDataRate(keys, record.u32(sequenceAt), sent, state, publisher);
+    return updateDataRate(keys, record.u32(sequenceAt), sent, state);
+}
+
+void ReverseLinkDataRate::decode(const Reading& reading, FieldVisitor& visitor) const {
+    visitDataRate(rate, reading, visitor);
 }
 
 } // namespace velmora::C2K

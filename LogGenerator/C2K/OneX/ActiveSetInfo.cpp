@@ -3,7 +3,7 @@
 
 #include "LogGenerator/C2K/OneX/ActiveSetInfo.h"
 
-#include "LogGenerator/C2K/PilotList.h"
+#include "LogGenerator/C2K/PilotFields.h"
 
 #include <cmath>
 
@@ -11,10 +11,12 @@ namespace velmora::C2K {
 
 namespace {
 
-/// A pilot's PN offset lies so far behind where the cursor stands; the cursor begins at the sub-packet's own
-/// start, not behind its header.
+/// A pilot's PN offset lies so far past the cursor; the cursor begins at the sub-packet's own
+/// start, not after its header.
 constexpr std::size_t pnOffsetAt = 12;
 constexpr std::size_t firstEnergyAt = 24;
+
+constexpr List pilotList{"k1xActiveSetInfo", List::Entries::Numbered, ""};
 
 constexpr double leastRatio = 0.00001; // -50 dB
 
@@ -29,17 +31,16 @@ std::size_t ActiveSetInfo::neededLength() const {
     return _count == 0 ? headerLength : _stride * (_count - 1) + _energyAt + 2;
 }
 
-Value ActiveSetInfo::pilots() const {
-    PilotList list;
+void ActiveSetInfo::visitPilots(FieldVisitor& visitor) const {
+    visitor.beginList(pilotList);
     for (std::size_t i = 0; i < _count; ++i) {
         const std::size_t cursor = _stride * i;
         const std::uint16_t pnOffset = _subPacket.u16(cursor + pnOffsetAt);
-        std::string text = decibels(energyRatio(_subPacket.u16(cursor + _energyAt)));
-        if (pnOffset == _referencePN)
-            text.insert(0, "(ref pilot) ");
-        list.add(i, pnOffset, std::move(text));
+        visitor.entryNumber(i, pnOffset);
+        visitor.real(pnOffset == _referencePN ? referencePilotEnergy : pilotEnergy,
+                     decibels(energyRatio(_subPacket.u16(cursor + _energyAt))));
     }
-    return list.value();
+    visitor.endList();
 }
 
 double ActiveSetInfo::energyRatio(std::uint16_t energy) const {

@@ -3,8 +3,8 @@
 
 #pragma once
 
+#include "LogGenerator/Fields/FieldVisitor.h"
 #include "LogMessages/Record.h"
-#include "PropertyLists/Value.h"
 
 #include <cstddef>
 
@@ -22,8 +22,8 @@ public:
     /// The length that its pilots need; `pilots` may only be asked for where the record has it.
     [[nodiscard]] std::size_t neededLength() const;
 
-    /// The pilot list. Without pilots it is an empty list; there is no "(none)".
-    [[nodiscard]] Value pilots() const;
+    /// Names the pilot list. Without pilots it is an empty list; there is no "(none)".
+    void visitPilots(FieldVisitor& visitor) const;
 
 private:
     [[nodiscard]] double energyRatio(std::uint16_t energy) const;

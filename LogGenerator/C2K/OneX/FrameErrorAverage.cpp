@@ -3,7 +3,7 @@
 
 #include "LogGenerator/C2K/OneX/FrameErrorAverage.h"
 
-#include "LogGenerator/Fields/NumberFormat.h"
+#include <string_view>
 
 namespace velmora::C2K {
 
@@ -34,10 +34,6 @@ float FrameErrorAverage::add(bool erased) {
 
 void FrameErrorAverage::clear() {
     _state.remove(stateKey);
-}
-
-std::string FrameErrorAverage::percent(float average) {
-    return std::string(NumberText("%.02f", static_cast<double>(average * 100.0F)).text()) + '%';
 }
 
 } // namespace velmora::C2K

@@ -6,7 +6,6 @@
 #include "PropertyLists/Value.h"
 
 #include <optional>
-#include <string>
 
 namespace velmora::C2K {
 
@@ -21,9 +20,6 @@ public:
     /// Takes one more frame in; the new average.
     float add(bool erased);
     void clear();
-
-    /// "%.02f%%" of the average in percent.
-    [[nodiscard]] static std::string percent(float average);
 
 private:
     Dictionary& _state;

@@ -3,6 +3,7 @@
 
 #include "LogGenerator/C2K/OneX/OneXStatus.h"
 
+#include "LogGenerator/C2K/BandClasses.h"
 #include "LogGenerator/C2K/OneX/ActiveSetInfo.h"
 #include "LogGenerator/C2K/OneX/FrameErrorAverage.h"
 #include "LogGenerator/C2K/OneX/SubPackets.h"
@@ -33,37 +34,50 @@ constexpr EnumText deviceStateRows[] = {
     {10, "Operation in PCG state [10]"},
     {11, "Powerup state [11]"},
 };
-constexpr NumberedTexts deviceStates(deviceStateRows, "[Bad Value ", "]");
+constexpr EnumTexts deviceStates(deviceStateRows, "[Bad Value ", "]");
 constexpr std::uint8_t trafficState = 8;
 
 constexpr ValueField systemStateFields[] = {
-    {"k1xDeviceState", u8At(4), deviceStates},
+    {"k1xDeviceState", u8At(4), text(deviceStates)},
 };
 
-constexpr Shown receiveLevel = real("%+.2f dBm", 0.334, -63.248);
+constexpr TextFormat receiveLevel = real("%+.2f dBm", 0.334, -63.248);
 
 constexpr ValueField radioFields[] = {
-    {"k1xRx0BandClass", u8At(4), bandClasses},
+    {"k1xRx0BandClass", u8At(4), text(bandClasses)},
     {"k1xRx0ChanNum", u16At(6), integer("%d")},
     {"k1xRxAGC0", i8At(10), receiveLevel},
-    {"k1xRx1BandClass", u8At(5), bandClasses, When::Connected},
-    {"k1xRx1ChanNum", u16At(8), integer("%d"), When::Connected},
-    {"k1xRxAGC1", i8At(11), receiveLevel, When::Connected},
-    {"k1xTxAGC", i16At(12), real("%+.2f dBm", 0.1), When::Connected},
+    {"k1xRx1BandClass", u8At(5), text(bandClasses), Validity::WhileConnected},
+    {"k1xRx1ChanNum", u16At(8), integer("%d"), Validity::WhileConnected},
+    {"k1xRxAGC1", i8At(11), receiveLevel, Validity::WhileConnected},
+    {"k1xTxAGC", i16At(12), real("%+.2f dBm", 0.1), Validity::WhileConnected},
 };
 
-/// Of the sub-packet.
-Value pilotsOf(Bytes bytes, const void*) {
-    return ActiveSetInfo(Record(bytes)).pilots();
+constexpr Field oldFrameErrorRate{"k1xTrafficFER", computed, real("%.02f%% (old)")};
+constexpr KeptRecords::Parts status = 1;
+constexpr KeptRecords::Parts closedAverage = 2;
+
+bool isTraffic(const Record& systemStatePacket) {
+    return systemStateFields[0].field.place.read(systemStatePacket) == trafficState;
+}
+
+/// Precondition: `accept` has found all of it.
+void visitStatus(const Record& record, FieldVisitor& visitor) {
+    const SubPackets subPackets(record);
+    const Record system = subPackets.from(subPackets.find(systemState));
+    const bool traffic = isTraffic(system);
+    visitFields(systemStateFields, system, traffic, visitor);
+    visitFields(radioFields, subPackets.from(subPackets.find(radioFrequency)), traffic, visitor);
+    ActiveSetInfo(subPackets.from(subPackets.find(activeSet))).visitPilots(visitor);
 }
 
 } // namespace
 
-void OneXStatus::parse(const Record& record, Dictionary& state, const Publisher& publisher) const {
+std::optional<Reading> OneXStatus::accept(const Record& record, Dictionary& state) const {
     if (record.size() < SubPackets::minimumLength) {
         logFormat(LogPriority::Error, "Log code 0x119c is %u bytes long but must be at least %lu bytes.",
                   lengthOf(record), static_cast<unsigned long>(SubPackets::minimumLength));
-        return;
+        return std::nullopt;
     }
     const SubPackets subPackets(record);
     const FoundSubPacket system = subPackets.find(systemState);
@@ -73,35 +87,43 @@ void OneXStatus::parse(const Record& record, Dictionary& state, const Publisher&
     for (const FoundSubPacket& each : {system, radio, active, fingers})
         if (each.outcome == FoundSubPacket::Outcome::Outside) {
             static_cast<void>(subPackets.reaches(each, SubPackets::headerLength, logCode()));
-            return;
+            return std::nullopt;
         }
     if (!system.found() || !radio.found() || !active.found() || !fingers.found()) {
         logFormat(LogPriority::Warning, "Log code 0x119c: missing subpacket (ss=%d,rf=%d,ai=%d,fi=%d).",
                   int{system.found()}, int{radio.found()}, int{active.found()}, int{fingers.found()});
-        return;
+        return std::nullopt;
     }
 
     // All that is needed is looked for first, so that a record is shown whole or not at all.
     if (!subPackets.reaches(system, endOf(systemStateFields, true), logCode()))
-        return;
-    const bool traffic = systemStateFields[0].where.read(subPackets.from(system)) == trafficState;
+        return std::nullopt;
+    const bool traffic = isTraffic(subPackets.from(system));
     if (!subPackets.reaches(radio, endOf(radioFields, traffic), logCode()) ||
         !subPackets.reaches(active, ActiveSetInfo::headerLength, logCode()))
-        return;
+        return std::nullopt;
     const ActiveSetInfo activeSetInfo(subPackets.from(active));
     if (!subPackets.reaches(active, activeSetInfo.neededLength(), logCode()))
-        return;
+        return std::nullopt;
 
-    publishFields(publisher, subPackets.from(system), systemStateFields, traffic);
-    publishFields(publisher, subPackets.from(radio), radioFields, traffic);
-    publisher.publishLater("k1xActiveSetInfo", pilotsOf, nullptr,
-                           record.part(active.offset, activeSetInfo.neededLength()).bytes());
+    Reading reading{record, std::nullopt, status};
     if (traffic)
-        return;
+        return reading;
     FrameErrorAverage average(state);
     if (const std::optional<float> last = average.value()) {
-        publisher.publish("k1xTrafficFER", FrameErrorAverage::percent(*last) + " (old)");
+        reading.number = *last;
+        reading.parts |= closedAverage;
         average.clear();
+    }
+    return reading;
+}
+
+void OneXStatus::decode(const Reading& reading, FieldVisitor& visitor) const {
+    if ((reading.parts & status) != 0)
+        visitStatus(reading.record, visitor);
+    if ((reading.parts & closedAverage) != 0) {
+        const auto average = static_cast<float>(*reading.number);
+        visitor.real(oldFrameErrorRate, static_cast<double>(average * 100.0F));
     }
 }
 

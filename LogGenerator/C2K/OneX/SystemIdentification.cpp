@@ -29,10 +29,10 @@ constexpr EnumText roamingIndicatorRows[] = {
     {11, "Banner ON [11]"},
     {12, "Banner OFF [12]"},
 };
-constexpr NumberedTexts roamingIndicators(roamingIndicatorRows, "ERI - ", "");
+constexpr EnumTexts roamingIndicators(roamingIndicatorRows, "ERI - ", "");
 
 constexpr ValueField roaming[] = {
-    {"k1xRoamingHome", u32At(42), roamingIndicators},
+    {"k1xRoamingHome", u32At(42), text(roamingIndicators)},
 };
 constexpr std::size_t systemTypeAt = 46;
 constexpr std::uint32_t cdmaSystem = 2;
@@ -53,40 +53,56 @@ constexpr ValueField revision[] = {
 static_assert(endOf(roaming, true) <= minimumLength && endOf(identities, true) <= minimumLength &&
               endOf(zone, true) <= minimumLength && endOf(revision, true) <= minimumLength);
 
-/// What stands for the identities of a system of another type, whose number is in these bytes.
-Value unknownSystem(Bytes type, const void*) {
-    return "(unknown system type " + std::to_string(static_cast<std::int32_t>(Record(type).u32(0))) + ")";
+/// What stands for the identities of a system of another type.
+constexpr EnumTexts unknownTypes("(unknown system type ", ")");
+constexpr Field unknownSystem{"kSystemId", u32At(systemTypeAt), text(unknownTypes)};
+constexpr Field unknownNetwork{"kNetworkId", u32At(systemTypeAt), text(unknownTypes)};
+
+constexpr KeptRecords::Parts identification = 1;
+constexpr KeptRecords::Parts baseStationPart = 2;
+
+void visitIdentities(const Record& record, FieldVisitor& visitor) {
+    if (record.u32(systemTypeAt) == cdmaSystem) {
+        visitFields(identities, record, true, visitor);
+    } else {
+        visitor.number(unknownSystem, unknownSystem.place.read(record));
+        visitor.number(unknownNetwork, unknownNetwork.place.read(record));
+    }
 }
 
 } // namespace
 
-void SystemIdentification::parse(const Record& record, Dictionary&, const Publisher& publisher) const {
+std::optional<Reading> SystemIdentification::accept(const Record& record, Dictionary&) const {
     if (record.size() < minimumLength) {
         logFormat(LogPriority::Error, "Log code 0x134f is %d bytes long but must be at least %lu bytes.",
                   static_cast<int>(record.size()), static_cast<unsigned long>(minimumLength));
-        return;
+        return std::nullopt;
     }
     const int version = record.u8(versionAt);
     if (version < leastVersion) {
         logFormat(LogPriority::Error,
                   "Log code 0x134f has version=%d; only version 2 or higher expected; dropping.", version);
-        return;
+        return std::nullopt;
     }
-    publishFields(publisher, record, roaming, true);
-    if (const Record type = record.part(systemTypeAt, 4); type.u32(0) == cdmaSystem) {
-        publishFields(publisher, record, identities, true);
-    } else {
-        for (const ValueField& identity : identities)
-            publisher.publishLater(identity.key, unknownSystem, nullptr, type.bytes());
-    }
-    publishFields(publisher, record, zone, true);
     if (record.size() >= endOf(baseStation, true))
-        publishFields(publisher, record, baseStation, true);
-    else
-        logFormat(LogPriority::Error,
-                  "Log code 0x134f is %d bytes long but must be at least %lu bytes for the base station id.",
-                  static_cast<int>(record.size()), static_cast<unsigned long>(endOf(baseStation, true)));
-    publishFields(publisher, record, revision, true);
+        return Reading{record, std::nullopt, identification | baseStationPart};
+    logFormat(LogPriority::Error,
+              "Log code 0x134f is %d bytes long but must be at least %lu bytes for the base station id.",
+              static_cast<int>(record.size()), static_cast<unsigned long>(endOf(baseStation, true)));
+    return Reading{record, std::nullopt, identification};
+}
+
+void SystemIdentification::decode(const Reading& reading, FieldVisitor& visitor) const {
+    const Record& record = reading.record;
+    if ((reading.parts & identification) != 0) {
+        visitFields(roaming, record, true, visitor);
+        visitIdentities(record, visitor);
+        visitFields(zone, record, true, visitor);
+    }
+    if ((reading.parts & baseStationPart) != 0)
+        visitFields(baseStation, record, true, visitor);
+    if ((reading.parts & identification) != 0)
+        visitFields(revision, record, true, visitor);
 }
 
 } // namespace velmora::C2K

@@ -7,9 +7,6 @@
 #include "LogGenerator/C2K/OneX/SubPackets.h"
 #include "Platform/SystemLog.h"
 
-#include <array>
-#include <cstring>
-
 namespace velmora::C2K {
 
 namespace {
@@ -17,34 +14,31 @@ namespace {
 constexpr std::uint8_t trafficDemodulation = 11;
 constexpr std::size_t erasureAt = 24; // in the sub-packet
 
-/// Of the average.
-Value percentOf(Bytes bytes, const void*) {
-    float average = 0;
-    std::memcpy(&average, bytes.data(), sizeof average);
-    return FrameErrorAverage::percent(average);
-}
+constexpr Field frameErrorRate{"k1xTrafficFER", computed, real("%.02f%%")};
 
 } // namespace
 
-void TrafficFER::parse(const Record& record, Dictionary& state, const Publisher& publisher) const {
+std::optional<Reading> TrafficFER::accept(const Record& record, Dictionary& state) const {
     if (record.size() < SubPackets::minimumLength) {
         logFormat(LogPriority::Error, "Log code 0x119d is %d bytes long but must be at least %ld bytes.",
                   static_cast<int>(record.size()), static_cast<long>(SubPackets::minimumLength));
-        return;
+        return std::nullopt;
     }
     const SubPackets subPackets(record);
     const FoundSubPacket demodulation = subPackets.find(trafficDemodulation);
     if (demodulation.outcome == FoundSubPacket::Outcome::Missing) {
         logLine(LogPriority::Warning, "Log code 0x119d: missing traffic demod subpacket.");
-        return;
+        return std::nullopt;
     }
     if (!subPackets.reaches(demodulation, erasureAt + 1, logCode()))
-        return;
+        return std::nullopt;
     const bool erased = subPackets.from(demodulation).u8(erasureAt) != 0;
-    const float average = FrameErrorAverage(state).add(erased);
-    std::array<std::uint8_t, sizeof average> bytes;
-    std::memcpy(bytes.data(), &average, sizeof average);
-    publisher.publishLater("k1xTrafficFER", percentOf, nullptr, bytes);
+    return Reading{Record(Bytes()), FrameErrorAverage(state).add(erased)};
+}
+
+void TrafficFER::decode(const Reading& reading, FieldVisitor& visitor) const {
+    const auto average = static_cast<float>(*reading.number);
+    visitor.real(frameErrorRate, static_cast<double>(average * 100.0F));
 }
 
 } // namespace velmora::C2K

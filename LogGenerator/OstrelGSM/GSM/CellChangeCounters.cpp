@@ -7,8 +7,14 @@
 
 namespace velmora {
 
-void CellChangeCounters::updateWithData(const Data&, std::uint32_t) {
+std::span<const View> CellChangeCounters::views() const {
+    return {};
+}
+
+void CellChangeCounters::trace() const {
     logLine(LogPriority::Warning, "CellChangeCounters");
 }
+
+void CellChangeCounters::unknownCode(std::uint32_t) const {}
 
 } // namespace velmora

@@ -7,8 +7,14 @@
 
 namespace velmora {
 
-void CodingScheme::updateWithData(const Data&, std::uint32_t) {
+std::span<const View> CodingScheme::views() const {
+    return {};
+}
+
+void CodingScheme::trace() const {
     logLine(LogPriority::Warning, "CellChangeCounters"); // the word of that section, shared on purpose
 }
+
+void CodingScheme::unknownCode(std::uint32_t) const {}
 
 } // namespace velmora

@@ -100,21 +100,19 @@ constexpr Field networkFields[] = {
 };
 constexpr Layout network = layout(32, networkFields); // 0x7135
 
+constexpr View sectionViews[] = {
+    {0x51F5, cellOptions},       {0x7135, network}, {0x51F6, timers},      {0x51FB, pbcch},
+    {0x51FD, systemInformation}, {0x51F4, si13},    {0x5137, reselection},
+};
+
 } // namespace
 
-void GPRSInformation::updateWithData(const Data& data, std::uint32_t logCode) {
+std::span<const View> GPRSInformation::views() const {
+    return sectionViews;
+}
+
+void GPRSInformation::trace() const {
     logLine(LogPriority::Warning, "GPRSInformation");
-    const Record record(data);
-    switch (logCode) {
-    case 0x51F4: show(record, si13); break;
-    case 0x51F5: show(record, cellOptions); break;
-    case 0x51F6: show(record, timers); break;
-    case 0x51FB: show(record, pbcch); break;
-    case 0x51FD: show(record, systemInformation); break;
-    case 0x5137: show(record, reselection); break;
-    case 0x7135: show(record, network); break;
-    default: unknownLogMessage(logCode);
-    }
 }
 
 } // namespace velmora

@@ -62,18 +62,21 @@ constexpr Field drxFields[] = {
 };
 constexpr Layout drx = layout(24, drxFields); // 0x51F6
 
+constexpr View sectionViews[] = {
+    {0x512C, state},
+    {0x5137, measurements},
+    {0x5072, dtx},
+    {0x51F6, drx},
+};
+
 } // namespace
 
-void GSMRRInfo::updateWithData(const Data& data, std::uint32_t logCode) {
+std::span<const View> GSMRRInfo::views() const {
+    return sectionViews;
+}
+
+void GSMRRInfo::trace() const {
     logLine(LogPriority::Warning, "GSMRRInfo");
-    const Record record(data);
-    switch (logCode) {
-    case 0x512C: show(record, state); break;
-    case 0x5137: show(record, measurements); break;
-    case 0x5072: show(record, dtx); break;
-    case 0x51F6: show(record, drx); break;
-    default: unknownLogMessage(logCode);
-    }
 }
 
 } // namespace velmora

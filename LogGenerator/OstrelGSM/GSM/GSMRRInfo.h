@@ -11,10 +11,10 @@ namespace velmora {
 class GSMRRInfo final : public Base {
 public:
     [[nodiscard]] std::string_view getSectionName() const override { return "GSM RR Info"; }
-    [[nodiscard]] std::vector<std::uint32_t> getLogCodeArray() const override {
-        return {0x512C, 0x5137, 0x5072, 0x51F6};
-    }
-    void updateWithData(const Data& data, std::uint32_t logCode) override;
+    [[nodiscard]] std::span<const View> views() const override;
+
+private:
+    void trace() const override;
 };
 
 } // namespace velmora

@@ -3,7 +3,6 @@
 
 #include "LogGenerator/OstrelGSM/GSM/GSMServingCell.h"
 
-#include "LogGenerator/Extra/CellFields.h"
 #include "Platform/SystemLog.h"
 #include "Platform/TelephonyService.h"
 
@@ -39,28 +38,29 @@ constexpr CellField cellFields[] = {
     {kVoxCellMonitorARFCN, CellNumber::Whole, "ARFCN", integer("%d"),
      "GSMServingCell: Failed to retrieve ARFCN\n"},
 };
+constexpr CellKind cellKinds[] = {
+    {kVoxCellMonitorRadioAccessTechnologyGSM, kVoxCellMonitorCellTypeServing},
+};
+constexpr CellTable servingCell{cellKinds, CellTable::Shown::First, cellFields};
+constexpr View sectionViews[] = {
+    {0x5134, identity},
+    {0x5137, levels},
+    {0x5076, dedicated},
+    cellInformation,
+};
 
 } // namespace
 
-void GSMServingCell::updateWithData(const Data& data, std::uint32_t logCode) {
-    logLine(LogPriority::Warning, "GSMServingCell");
-    const Record record(data);
-    switch (logCode) {
-    case 0x5134: show(record, identity); break;
-    case 0x5137: show(record, levels); break;
-    case 0x5076: show(record, dedicated); break;
-    case 0xFF0001: showServingCell(data); break;
-    default: unknownLogMessage(logCode);
-    }
+std::span<const View> GSMServingCell::views() const {
+    return sectionViews;
 }
 
-void GSMServingCell::showServingCell(const Data& data) {
-    const std::vector<Cell>* cells = cellsOf(data);
-    if (!cells)
-        return;
-    if (const Cell* cell =
-            firstCell(*cells, {kVoxCellMonitorRadioAccessTechnologyGSM, kVoxCellMonitorCellTypeServing}))
-        writeCellFields(dictionary(), *cell, cellFields);
+void GSMServingCell::trace() const {
+    logLine(LogPriority::Warning, "GSMServingCell");
+}
+
+const CellTable& GSMServingCell::cellTable() const {
+    return servingCell;
 }
 
 } // namespace velmora

@@ -11,7 +11,7 @@ namespace {
 
 constexpr std::size_t minimumLength = 15; // 0x4005
 // "UMTS Set" reads other entries at the same place: which of the two counts is not zero tells what they are.
-constexpr Where count = u8At(14);
+constexpr Place count = u8At(14);
 static_assert(count.end() <= minimumLength);
 
 constexpr Field cellFields[] = {
@@ -21,21 +21,31 @@ constexpr Field cellFields[] = {
     {"Ranking Value", i16At(5), integer("%d")},
 };
 constexpr Layout cell = layout(7, cellFields);
+constexpr List rows{};
+
+CountedList cells(const Record& record) {
+    return CountedList(record, minimumLength, cell.minimumLength,
+                       static_cast<std::size_t>(count.read(record)));
+}
+
+constexpr View sectionViews[] = {{0x4005, minimumLength}};
 
 } // namespace
 
-void GSMSet::updateWithData(const Data& data, std::uint32_t logCode) {
+std::span<const View> GSMSet::views() const {
+    return sectionViews;
+}
+
+void GSMSet::trace() const {
     logLine(LogPriority::Warning, "GSMSet");
-    if (logCode != 0x4005) {
-        unknownLogMessage(logCode);
-        return;
-    }
-    const Record record(data);
-    if (record.size() < minimumLength)
-        return;
-    const CountedList entries(record, minimumLength, cell.minimumLength,
-                              static_cast<std::size_t>(count.read(record)));
-    showRows(entries, cell, logCode);
+}
+
+void GSMSet::check(const View& view, const Record& record) const {
+    reportMissingEntries(cells(record), view.code);
+}
+
+void GSMSet::decode(const View&, const Record& record, FieldVisitor& visitor) const {
+    visitor.rows(rows, cells(record), cell);
 }
 
 } // namespace velmora

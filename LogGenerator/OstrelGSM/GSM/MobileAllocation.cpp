@@ -14,32 +14,37 @@ constexpr Field hoppingFields[] = {
 };
 constexpr Layout hopping = layout(15, hoppingFields); // 0x51F8; the count at 14 and the ARFCNs follow
 constexpr std::size_t arfcnLength = 2;
+constexpr Field arfcn{"", u16At(0), integer("%d")};
+static_assert(arfcn.place.end() <= arfcnLength);
+constexpr List arfcnList{"ARFCNs", List::Entries::Values, ""};
 
 CountedList arfcns(const Record& record) {
     return CountedList(record, hopping.minimumLength, arfcnLength, record.u8(14));
 }
 
-void writeARFCNs(Dictionary& node, const Record& record) {
-    const CountedList entries = arfcns(record);
-    const ArrayRef list = makeArray();
-    for (std::size_t i = 0; i < entries.whole(); ++i)
-        list->append(NumberText("%d", std::int64_t{entries[i].u16(0)}).text());
-    node.set("ARFCNs", list);
-}
+constexpr View sectionViews[] = {{0x51F8, hopping.minimumLength}};
 
 } // namespace
 
-void MobileAllocation::updateWithData(const Data& data, std::uint32_t logCode) {
+std::span<const View> MobileAllocation::views() const {
+    return sectionViews;
+}
+
+void MobileAllocation::trace() const {
     logLine(LogPriority::Warning, "MobileAllocation");
-    if (logCode != 0x51F8) {
-        unknownLogMessage(logCode);
-        return;
-    }
-    const Record record(data);
-    if (!show(record, hopping))
-        return;
-    reportMissingEntries(arfcns(record), logCode);
-    showWith<writeARFCNs>(record);
+}
+
+void MobileAllocation::check(const View& view, const Record& record) const {
+    reportMissingEntries(arfcns(record), view.code);
+}
+
+void MobileAllocation::decode(const View&, const Record& record, FieldVisitor& visitor) const {
+    visitor.fields(record, hopping);
+    const CountedList entries = arfcns(record);
+    visitor.beginList(arfcnList);
+    for (std::size_t i = 0; i < entries.whole(); ++i)
+        visitor.number(arfcn, arfcn.place.read(entries[i]));
+    visitor.endList();
 }
 
 } // namespace velmora

@@ -3,7 +3,6 @@
 
 #include "LogGenerator/OstrelGSM/GSM/NeighboringCells.h"
 
-#include "LogGenerator/Extra/CellFields.h"
 #include "Platform/SystemLog.h"
 #include "Platform/TelephonyService.h"
 
@@ -11,20 +10,21 @@ namespace velmora {
 
 namespace {
 
-constexpr std::size_t measuredMinimumLength = 29; // 0x5137
+constexpr std::uint32_t measuredCode = 0x5137;
+constexpr std::size_t measuredMinimumLength = 29;
 constexpr Field measuredFields[] = {
     {"ARFCN", u16At(0), integer("%d")},
     {"RSSI", u8At(2), integer("%d")}, // without a unit
     {"C1 Value", i32At(3), integer("%d")},
 };
 constexpr Layout measured = layout(14, measuredFields);
-constexpr Where measuredARFCN = measuredFields[0].where;
+constexpr Place measuredARFCN = measuredFields[0].place;
 
 constexpr std::size_t bsicMinimumLength = 15; // 0x51FF
 constexpr std::size_t bsicEntryLength = 4;
-constexpr Where bsicARFCN = u16At(0);
-constexpr Where bsic = u8At(2);
-static_assert(bsicARFCN.end() <= bsicEntryLength && bsic.end() <= bsicEntryLength);
+constexpr Place bsicARFCN = u16At(0);
+constexpr Field bsic{"BSIC", u8At(2), integer("%d")};
+static_assert(bsicARFCN.end() <= bsicEntryLength && bsic.place.end() <= bsicEntryLength);
 
 // Twice the telephony service's number is the level in dBm.
 constexpr CellField knownFields[] = {
@@ -34,66 +34,87 @@ constexpr CellField knownFields[] = {
      unless(levelNotMeasured, "", integer("%d dBm", 0, 2)), "NeighboringCells: Failed to retrieve RSSI\n"},
 };
 
-constexpr CellRows known = {{kVoxCellMonitorRadioAccessTechnologyGSM, kVoxCellMonitorCellTypeNeighbor},
-                            knownFields};
+constexpr CellKind knownKinds[] = {
+    {kVoxCellMonitorRadioAccessTechnologyGSM, kVoxCellMonitorCellTypeNeighbor},
+};
+constexpr CellTable known{knownKinds, CellTable::Shown::Rows, knownFields};
 
-/// `bytes`: the number of cells, the entries of 0x5137, then those of 0x51FF.
-void fill(Array& rows, const Record& bytes) {
-    const CountedList cells(bytes, 1, measured.minimumLength, bytes.u8(0));
-    const std::size_t behind = 1 + cells.count() * measured.minimumLength;
-    const CountedList bsics(bytes, behind, bsicEntryLength, (bytes.size() - behind) / bsicEntryLength);
-    for (std::size_t i = 0; i < cells.count(); ++i) {
-        Dictionary& row = rows.appendRow();
-        writeFields(row, cells[i], measured);
-        // Of an ARFCN that stands there twice, the later one counts.
-        for (std::size_t j = bsics.count(); j-- > 0;)
-            if (bsicARFCN.read(bsics[j]) == measuredARFCN.read(cells[i])) {
-                writeValue(row, "BSIC", integer("%d"), bsic.read(bsics[j]));
-                break;
-            }
-    }
+constexpr List rows{};
+
+CountedList measuredCells(const Record& record) {
+    return CountedList(record, measuredMinimumLength, measured.minimumLength, record.u8(28));
 }
+
+CountedList bsics(const Record& record) {
+    return CountedList(record, bsicMinimumLength, bsicEntryLength, record.u8(14));
+}
+
+/// What `bsics` gave of an earlier record.
+CountedList bsicEntries(Bytes entries) {
+    return CountedList(Record(entries), 0, bsicEntryLength, entries.size() / bsicEntryLength);
+}
+constexpr View sectionViews[] = {
+    {measuredCode, measuredMinimumLength},
+    {0x51FF, bsicMinimumLength},
+    cellInformation,
+};
 
 } // namespace
 
-void NeighboringCells::updateWithData(const Data& data, std::uint32_t logCode) {
+std::span<const View> NeighboringCells::views() const {
+    return sectionViews;
+}
+
+void NeighboringCells::trace() const {
     logLine(LogPriority::Warning, "NeighboringCells");
+}
+
+const CellTable& NeighboringCells::cellTable() const {
+    return known;
+}
+
+void NeighboringCells::check(const View& view, const Record& record) const {
+    reportMissingEntries(view.code == measuredCode ? measuredCells(record) : bsics(record), view.code);
+}
+
+void NeighboringCells::updateWithData(const Data& data, std::uint32_t logCode) {
     const Record record(data);
-    switch (logCode) {
-    case 0x5137: showMeasuredCells(record); break;
-    case 0x51FF: keepBSICs(record); break;
-    case 0xFF0001: showKnownCells(data); break;
-    default: unknownLogMessage(logCode);
+    const View* const view = viewOf(logCode);
+    if (!view || view->code == cellInformation.code || record.size() < view->minimumLength) {
+        CellSection::updateWithData(data, logCode);
+        return;
+    }
+    trace();
+    check(*view, record);
+    if (view->code == measuredCode) {
+        // The BSICs as they are known now go with the cells.
+        keep(*view, record, 1, [this] { _bsicsOfCells = arfcnToBsic; });
+    } else {
+        const Bytes kept = bsics(record).entries().bytes();
+        arfcnToBsic.assign(kept.begin(), kept.end());
     }
 }
 
-void NeighboringCells::showMeasuredCells(const Record& record) {
-    if (record.size() < measuredMinimumLength)
+void NeighboringCells::decode(const View& view, const Record& record, FieldVisitor& visitor) const {
+    if (view.code == cellInformation.code) {
+        CellSection::decode(view, record, visitor);
         return;
-    const CountedList entries(record, measuredMinimumLength, measured.minimumLength, record.u8(28));
-    reportMissingEntries(entries, 0x5137);
-    // The BSICs as they are known now go with the cells.
-    const Bytes cells = entries.entries().bytes();
-    _measuredCells.assign(1, static_cast<std::uint8_t>(entries.whole()));
-    _measuredCells.insert(_measuredCells.end(), cells.begin(), cells.end());
-    _measuredCells.insert(_measuredCells.end(), arfcnToBsic.begin(), arfcnToBsic.end());
-    showElementsWith<fill>(Record(Bytes(_measuredCells)));
-}
-
-void NeighboringCells::keepBSICs(const Record& record) {
-    if (record.size() < bsicMinimumLength)
-        return;
-    const CountedList entries(record, bsicMinimumLength, bsicEntryLength, record.u8(14));
-    reportMissingEntries(entries, 0x51FF);
-    const Bytes kept = entries.entries().bytes();
-    arfcnToBsic.assign(kept.begin(), kept.end());
-}
-
-void NeighboringCells::showKnownCells(const Data& data) {
-    if (const std::vector<Cell>* cells = cellsOf(data))
-        writeCellRows(array(), *cells, known, _knownCells);
-    else
-        clearElements();
+    }
+    const CountedList cells = measuredCells(record);
+    const CountedList knownBSICs = bsicEntries(_bsicsOfCells);
+    visitor.beginList(rows);
+    for (std::size_t i = 0; i < cells.whole(); ++i) {
+        visitor.beginRow();
+        visitor.fields(cells[i], measured);
+        // Of an ARFCN that stands there twice, the later one counts.
+        for (std::size_t j = knownBSICs.count(); j-- > 0;)
+            if (bsicARFCN.read(knownBSICs[j]) == measuredARFCN.read(cells[i])) {
+                visitor.number(bsic, bsic.place.read(knownBSICs[j]));
+                break;
+            }
+        visitor.endRow();
+    }
+    visitor.endList();
 }
 
 } // namespace velmora

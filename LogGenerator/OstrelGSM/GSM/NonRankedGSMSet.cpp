@@ -7,8 +7,14 @@
 
 namespace velmora {
 
-void NonRankedGSMSet::updateWithData(const Data&, std::uint32_t) {
+std::span<const View> NonRankedGSMSet::views() const {
+    return {};
+}
+
+void NonRankedGSMSet::trace() const {
     logLine(LogPriority::Warning, "NonRankedGSMSet");
 }
+
+void NonRankedGSMSet::unknownCode(std::uint32_t) const {}
 
 } // namespace velmora

@@ -23,31 +23,38 @@ CountedList networks(const Record& record) {
     return CountedList(record, minimumLength, stride, entryLength, record.u8(16));
 }
 
-void fill(Array& rows, const Record& record) {
-    const CountedList entries = networks(record);
-    for (std::size_t i = 0; i < entries.whole(); ++i) {
-        const Record e = entries[i];
-        Dictionary& row = rows.appendRow();
-        row.setText("Mobile Country Code", NumberText("%d", threeDigits(e.u8(0), e.u8(2), e.u8(4))).text());
-        row.setText("Mobile Network Code", NumberText("%d", threeDigits(e.u8(1), e.u8(3), e.u8(5))).text());
-    }
-}
+constexpr List rows{};
+constexpr Field countryCode{"Mobile Country Code", computed, integer("%d")};
+constexpr Field networkCode{"Mobile Network Code", computed, integer("%d")};
+
+constexpr View sectionViews[] = {{0x7150, minimumLength}};
 
 } // namespace
 
-void EquivalentPLMNList::updateWithData(const Data& data, std::uint32_t logCode) {
+std::span<const View> EquivalentPLMNList::views() const {
+    return sectionViews;
+}
+
+void EquivalentPLMNList::trace() const {
     logLine(LogPriority::Warning, "Equivalent PLMN List");
-    if (logCode != 0x7150) {
-        unknownLogMessage(logCode);
-        return;
-    }
-    const Record record(data);
-    if (record.size() < minimumLength)
-        return;
-    const CountedList entries = networks(record);
+}
+
+void EquivalentPLMNList::check(const View& view, const Record& record) const {
+    reportMissingEntries(networks(record), view.code);
+}
+
+void EquivalentPLMNList::decode(const View&, const Record& record, FieldVisitor& visitor) const {
     // The list ends with the last entry that lies wholly inside the record.
-    reportMissingEntries(entries, logCode);
-    showElementsWith<fill>(record);
+    const CountedList entries = networks(record);
+    visitor.beginList(rows);
+    for (std::size_t i = 0; i < entries.whole(); ++i) {
+        const Record e = entries[i];
+        visitor.beginRow();
+        visitor.number(countryCode, threeDigits(e.u8(0), e.u8(2), e.u8(4)));
+        visitor.number(networkCode, threeDigits(e.u8(1), e.u8(3), e.u8(5)));
+        visitor.endRow();
+    }
+    visitor.endList();
 }
 
 } // namespace velmora

@@ -15,16 +15,19 @@ constexpr Field stateFields[] = {
 };
 constexpr Layout state = layout(16, stateFields); // 0x7131
 
+constexpr View sectionViews[] = {
+    {0x7131, state},
+    {0x7132, OstrelGSM::registration},
+};
+
 } // namespace
 
-void ProcessCO::updateWithData(const Data& data, std::uint32_t logCode) {
+std::span<const View> ProcessCO::views() const {
+    return sectionViews;
+}
+
+void ProcessCO::trace() const {
     logLine(LogPriority::Warning, "ProcessCS"); // the circuit-switched section's word, shared on purpose
-    const Record record(data);
-    switch (logCode) {
-    case 0x7132: show(record, OstrelGSM::registration); break;
-    case 0x7131: show(record, state); break;
-    default: unknownLogMessage(logCode);
-    }
 }
 
 } // namespace velmora

@@ -34,16 +34,19 @@ constexpr Field stateFields[] = {
 };
 constexpr Layout state = layout(16, stateFields); // 0x7131
 
+constexpr View sectionViews[] = {
+    {0x7131, state},
+    {0x7132, OstrelGSM::registration},
+};
+
 } // namespace
 
-void ProcessCS::updateWithData(const Data& data, std::uint32_t logCode) {
+std::span<const View> ProcessCS::views() const {
+    return sectionViews;
+}
+
+void ProcessCS::trace() const {
     logLine(LogPriority::Warning, "ProcessCS");
-    const Record record(data);
-    switch (logCode) {
-    case 0x7132: show(record, OstrelGSM::registration); break;
-    case 0x7131: show(record, state); break;
-    default: unknownLogMessage(logCode);
-    }
 }
 
 } // namespace velmora

@@ -11,8 +11,10 @@ namespace velmora {
 class ProcessCS final : public Base {
 public:
     [[nodiscard]] std::string_view getSectionName() const override { return "Process CS"; }
-    [[nodiscard]] std::vector<std::uint32_t> getLogCodeArray() const override { return {0x7131, 0x7132}; }
-    void updateWithData(const Data& data, std::uint32_t logCode) override;
+    [[nodiscard]] std::span<const View> views() const override;
+
+private:
+    void trace() const override;
 };
 
 } // namespace velmora

@@ -54,16 +54,19 @@ constexpr Field stateFields[] = {
 };
 constexpr Layout state = layout(16, stateFields); // 0x7130
 
+constexpr View sectionViews[] = {
+    {0x7130, state},
+    {0x7132, OstrelGSM::registration},
+};
+
 } // namespace
 
-void ProcessPS::updateWithData(const Data& data, std::uint32_t logCode) {
+std::span<const View> ProcessPS::views() const {
+    return sectionViews;
+}
+
+void ProcessPS::trace() const {
     logLine(LogPriority::Warning, "ProcessPS");
-    const Record record(data);
-    switch (logCode) {
-    case 0x7132: show(record, OstrelGSM::registration); break;
-    case 0x7130: show(record, state); break;
-    default: unknownLogMessage(logCode);
-    }
 }
 
 } // namespace velmora

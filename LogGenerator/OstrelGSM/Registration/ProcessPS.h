@@ -11,8 +11,10 @@ namespace velmora {
 class ProcessPS final : public Base {
 public:
     [[nodiscard]] std::string_view getSectionName() const override { return "Process PS"; }
-    [[nodiscard]] std::vector<std::uint32_t> getLogCodeArray() const override { return {0x7130, 0x7132}; }
-    void updateWithData(const Data& data, std::uint32_t logCode) override;
+    [[nodiscard]] std::span<const View> views() const override;
+
+private:
+    void trace() const override;
 };
 
 } // namespace velmora

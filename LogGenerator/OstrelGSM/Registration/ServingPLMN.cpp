@@ -3,7 +3,6 @@
 
 #include "LogGenerator/OstrelGSM/Registration/ServingPLMN.h"
 
-#include "LogGenerator/Extra/CellFields.h"
 #include "Platform/SystemLog.h"
 #include "Platform/TelephonyService.h"
 
@@ -32,23 +31,26 @@ constexpr Field areaFields[] = {
     {"Routing Area Code", u8At(20), integer("%d")},
     {"Service Type", u8At(14), text(serviceTypes)},
 };
-constexpr Layout areas = layout(32, areaFields); // 0x7135
+constexpr Layout areas = layout(32, areaFields);
+constexpr std::uint32_t identityCode = 0x7135;
+constexpr Field countryCode{"Mobile Country Code", computed, plainText()};
+constexpr Field networkCode{"Mobile Network Code", computed, plainText()};
 
 /// A BCD digit as its character; a filler (10 and above) is a blank.
 char digit(unsigned halfByte) {
     return static_cast<char>(halfByte < 10 ? '0' + halfByte : ' ');
 }
 
-void writeIdentity(Dictionary& node, const Record& record) {
+void visitIdentity(const Record& record, FieldVisitor& visitor) {
     // BCD as in 3GPP TS 24.008, 10.5.1.3: two digits a byte, the lower half first, MNC digit 3 in the middle
     // byte. A two-digit MNC so ends in a blank.
     const char mcc[] = {digit(record.bits(15, 0, 4)), digit(record.bits(15, 4, 4)),
                         digit(record.bits(16, 0, 4))};
     const char mnc[] = {digit(record.bits(17, 0, 4)), digit(record.bits(17, 4, 4)),
                         digit(record.bits(16, 4, 4))};
-    node.setText("Mobile Country Code", std::string_view(mcc, sizeof mcc));
-    node.setText("Mobile Network Code", std::string_view(mnc, sizeof mnc));
-    writeFields(node, record, areas);
+    visitor.text(countryCode, {mcc, sizeof mcc});
+    visitor.text(networkCode, {mnc, sizeof mnc});
+    visitor.fields(record, areas);
 }
 
 // Plain decimal numbers, so that a leading zero of the MNC is lost, under the labels that 0x7135 writes as
@@ -62,40 +64,36 @@ constexpr CellField cellFields[] = {
      "ServingPLMN: Failed to retrieve LAC\n"},
 };
 
-bool isServingCell(const Cell& cell) {
-    return cell.kind == CellKind(kVoxCellMonitorRadioAccessTechnologyGSM, kVoxCellMonitorCellTypeServing) ||
-           cell.kind == CellKind(kVoxCellMonitorRadioAccessTechnologyUMTS, kVoxCellMonitorCellTypeServing);
-}
+constexpr CellKind cellKinds[] = {
+    {kVoxCellMonitorRadioAccessTechnologyGSM, kVoxCellMonitorCellTypeServing},
+    {kVoxCellMonitorRadioAccessTechnologyUMTS, kVoxCellMonitorCellTypeServing},
+};
+constexpr CellTable servingCell{cellKinds, CellTable::Shown::First, cellFields};
+constexpr View sectionViews[] = {
+    {identityCode, areas.minimumLength},
+    {0x7132, selection},
+    cellInformation,
+};
 
 } // namespace
 
-void ServingPLMN::updateWithData(const Data& data, std::uint32_t logCode) {
+std::span<const View> ServingPLMN::views() const {
+    return sectionViews;
+}
+
+void ServingPLMN::trace() const {
     logLine(LogPriority::Warning, "Serving PLMN");
-    const Record record(data);
-    switch (logCode) {
-    case 0x7132: show(record, selection); break;
-    case 0x7135: showIdentity(record); break;
-    case 0xFF0001: showServingCell(data); break;
-    default: unknownLogMessage(logCode);
-    }
 }
 
-void ServingPLMN::showIdentity(const Record& record) {
-    if (record.size() < areas.minimumLength)
-        return;
-    showWith<writeIdentity>(record);
+const CellTable& ServingPLMN::cellTable() const {
+    return servingCell;
 }
 
-void ServingPLMN::showServingCell(const Data& data) {
-    const std::vector<Cell>* cells = cellsOf(data);
-    if (!cells)
-        return;
-    for (const Cell& cell : *cells) {
-        if (!isServingCell(cell))
-            continue;
-        writeCellFields(dictionary(), cell, cellFields);
-        return; // only the first serving cell counts
-    }
+void ServingPLMN::decode(const View& view, const Record& record, FieldVisitor& visitor) const {
+    if (view.code == identityCode)
+        visitIdentity(record, visitor);
+    else
+        CellSection::decode(view, record, visitor);
 }
 
 } // namespace velmora

@@ -3,24 +3,20 @@
 
 #pragma once
 
-#include "LogGenerator/Base.h"
+#include "LogGenerator/Extra/CellSection.h"
 
 namespace velmora {
 
 /// "Serving PLMN": the network that the phone is registered with, its areas and the service it gives.
-class ServingPLMN final : public Base {
+class ServingPLMN final : public CellSection {
 public:
     [[nodiscard]] std::string_view getSectionName() const override { return "Serving PLMN"; }
-    [[nodiscard]] std::vector<std::uint32_t> getLogCodeArray() const override {
-        return {0x7135, 0x7132, 0xFF0001};
-    }
-    void updateWithData(const Data& data, std::uint32_t logCode) override;
+    [[nodiscard]] std::span<const View> views() const override;
+    void decode(const View& view, const Record& record, FieldVisitor& visitor) const override;
 
 private:
-    /// 0x7135: PLMN, areas and service type as the network signals them.
-    void showIdentity(const Record& record);
-    /// 0xFF0001: the first serving GSM or UMTS cell that the telephony service knows.
-    void showServingCell(const Data& data);
+    [[nodiscard]] const CellTable& cellTable() const override;
+    void trace() const override;
 };
 
 } // namespace velmora

@@ -13,33 +13,32 @@ namespace {
 
 constexpr std::int64_t activeSet = 0;
 
-DictionaryRef row(const Record& cell, const Record& measurement, int power) {
-    const int ecNo = Base::lookUpECNO(SearcherRecord::energy(measurement));
-    const int rssi = (power + 512) / 10 - 106; // rounded toward zero
-    DictionaryRef result = makeDictionary();
-    writeValue(*result, "Scrambling Code", integer("%d"), SearcherRecord::scramblingCode.read(cell));
-    // A level, whose unit is shown so all the same.
-    writeValue(*result, "RSCP", integer("%d dB"), rssi + ecNo);
-    writeValue(*result, "Energy Per Chip", integer("%d dB"), ecNo);
-    return result;
-}
-
-void fill(Array& rows, const Record& record) {
-    const SearcherRecord searcher(record);
-    for (std::size_t i = 0; i < searcher.measurements().whole(); ++i)
-        if (const Record cell = searcher.cells()[i]; SearcherRecord::setType.read(cell) == activeSet)
-            rows.append(row(cell, searcher.measurements()[i], searcher.power()));
-}
+constexpr Field scramblingCode{"Scrambling Code", SearcherRecord::scramblingCode, integer("%d")};
+// A level, whose unit is shown so all the same.
+constexpr Field codePower{"RSCP", computed, integer("%d dB")};
+constexpr Field energyPerChip{"Energy Per Chip", computed, integer("%d dB")};
 
 } // namespace
 
-void ActiveSet::showCells(const Record& record, std::uint32_t logCode) {
+void ActiveSet::checkCells(const Record& record) const {
+    // The measurements follow the cells: one that lies wholly inside the record has its cell there too.
+    reportMissingEntries(SearcherRecord(record).measurements(), SearcherRecord::code);
+}
+
+void ActiveSet::visitCells(const Record& record, FieldVisitor& visitor) const {
     const SearcherRecord searcher(record);
-    if (searcher.cells().count() == 0)
-        return;
-    // The measurements lie behind the cells: one that lies wholly inside the record has its cell there too.
-    reportMissingEntries(searcher.measurements(), logCode);
-    showElementsWith<fill>(record);
+    const int rssi = (searcher.power() + 512) / 10 - 106; // rounded toward zero
+    for (std::size_t i = 0; i < searcher.measurements().whole(); ++i) {
+        const Record cell = searcher.cells()[i];
+        if (SearcherRecord::setType.read(cell) != activeSet)
+            continue;
+        const int ecNo = lookUpECNO(SearcherRecord::energy(searcher.measurements()[i]));
+        visitor.beginRow();
+        visitor.number(scramblingCode, scramblingCode.place.read(cell));
+        visitor.number(codePower, rssi + ecNo);
+        visitor.number(energyPerChip, ecNo);
+        visitor.endRow();
+    }
 }
 
 } // namespace velmora

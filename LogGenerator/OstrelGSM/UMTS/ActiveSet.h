@@ -14,7 +14,11 @@ public:
 
 protected:
     [[nodiscard]] std::string_view traceName() const override { return "ActiveSet"; }
-    void showCells(const Record& record, std::uint32_t logCode) override;
+    void checkCells(const Record& record) const override;
+    [[nodiscard]] std::size_t neededLength(const View& view, const Record& record) const override {
+        return Base::neededLength(view, record);
+    }
+    void visitCells(const Record& record, FieldVisitor& visitor) const override;
 };
 
 } // namespace velmora

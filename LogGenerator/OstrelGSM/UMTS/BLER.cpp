@@ -12,28 +12,39 @@ namespace {
 constexpr Field windowFields[] = {
     {"Window Size", u16At(14), integer("%d")},
 };
-constexpr Layout window = layout(16, windowFields); // 0x4116; the count at 13, the channels behind
+constexpr Layout window = layout(16, windowFields); // 0x4116; the count at 13, the channels after it
 
 constexpr Field channelFields[] = {
     {"Transport Channel ID", u8At(0), integer("%d")},
     {"CRC Received", i32At(1), integer("%d")},
     {"CRC Received in Error", i32At(5), integer("%d")},
 };
-constexpr ListField channelList = {"Transport Channels", layout(9, channelFields)};
+constexpr Layout channel = layout(9, channelFields);
+constexpr List channelList{"Transport Channels"};
+
+CountedList channels(const Record& record) {
+    return CountedList(record, window.minimumLength, channel.minimumLength, record.u8(13));
+}
+
+constexpr View sectionViews[] = {{0x4116, window.minimumLength}};
 
 } // namespace
 
-void BLER::updateWithData(const Data& data, std::uint32_t logCode) {
+std::span<const View> BLER::views() const {
+    return sectionViews;
+}
+
+void BLER::trace() const {
     logLine(LogPriority::Warning, "BLER");
-    if (logCode != 0x4116) {
-        unknownLogMessage(logCode);
-        return;
-    }
-    const Record record(data);
-    if (!show(record, window))
-        return;
-    const CountedList channels(record, window.minimumLength, channelList.entry.minimumLength, record.u8(13));
-    showList(channelList, channels, logCode);
+}
+
+void BLER::check(const View& view, const Record& record) const {
+    reportMissingEntries(channels(record), view.code);
+}
+
+void BLER::decode(const View&, const Record& record, FieldVisitor& visitor) const {
+    visitor.fields(record, window);
+    visitor.rows(channelList, channels(record), channel);
 }
 
 } // namespace velmora

@@ -33,33 +33,52 @@ constexpr Field processFields[] = {
     {"Block Errors", u16At(7), integer("%u")},
 };
 constexpr Layout process = layout(9, processFields);
-constexpr ListField primaryProcesses = {"Primary HARQ Process", process};
-constexpr ListField secondaryProcesses = {"Secondary HARQ Process", process};
+constexpr List primaryList{"Primary HARQ Process"};
+constexpr List secondaryList{"Secondary HARQ Process"};
 // How far every primary process moves the secondary ones: not the nine bytes of its entry. That is how the
 // record is read, and it is kept.
 constexpr std::size_t primarySpan = 162;
 
+CountedList primaryProcesses(const Record& record) {
+    return CountedList(record, status.minimumLength, process.minimumLength, record.u8(primaryCountAt));
+}
+
+CountedList secondaryProcesses(const Record& record) {
+    return CountedList(record, status.minimumLength + primarySpan * record.u8(primaryCountAt),
+                       process.minimumLength, record.u8(secondaryCountAt));
+}
+
+constexpr View sectionViews[] = {{0x4221, status.minimumLength}};
+
 } // namespace
 
-void HSDPAInformation::updateWithData(const Data& data, std::uint32_t logCode) {
+std::span<const View> HSDPAInformation::views() const {
+    return sectionViews;
+}
+
+void HSDPAInformation::trace() const {
     logLine(LogPriority::Warning, "HSDPA Info");
-    if (logCode != 0x4221)
-        return; // without a word, unlike the other sections
-    const Record record(data);
-    if (!show(record, status))
-        return;
-    const std::size_t primaryCount = record.u8(primaryCountAt);
-    const std::size_t secondaryCount = record.u8(secondaryCountAt);
-    // Where a kind has no process, what was shown of it stays.
-    if (primaryCount != 0) {
-        const CountedList primary(record, status.minimumLength, process.minimumLength, primaryCount);
-        showList(primaryProcesses, primary, logCode);
-    }
-    if (secondaryCount != 0) {
-        const CountedList secondary(record, status.minimumLength + primarySpan * primaryCount,
-                                    process.minimumLength, secondaryCount);
-        showList(secondaryProcesses, secondary, logCode);
-    }
+}
+
+void HSDPAInformation::unknownCode(std::uint32_t) const {} // without a log line, unlike the other sections
+
+void HSDPAInformation::check(const View& view, const Record& record) const {
+    reportMissingEntries(primaryProcesses(record), view.code);
+    reportMissingEntries(secondaryProcesses(record), view.code);
+}
+
+KeptRecords::Parts HSDPAInformation::partsOf(const View&, const Record& record) const {
+    return 1U | (primaryProcesses(record).count() != 0 ? 2U : 0U) |
+           (secondaryProcesses(record).count() != 0 ? 4U : 0U);
+}
+
+void HSDPAInformation::decode(const View&, const Record& record, FieldVisitor& visitor) const {
+    visitor.fields(record, status);
+    // Of a kind without processes, what was shown before stays.
+    if (const CountedList primary = primaryProcesses(record); primary.count() != 0)
+        visitor.rows(primaryList, primary, process);
+    if (const CountedList secondary = secondaryProcesses(record); secondary.count() != 0)
+        visitor.rows(secondaryList, secondary, process);
 }
 
 } // namespace velmora

@@ -7,8 +7,14 @@
 
 namespace velmora {
 
-void NonRankedUMTSSet::updateWithData(const Data&, std::uint32_t) {
+std::span<const View> NonRankedUMTSSet::views() const {
+    return {};
+}
+
+void NonRankedUMTSSet::trace() const {
     logLine(LogPriority::Warning, "NonRankedUMTSSet");
 }
+
+void NonRankedUMTSSet::unknownCode(std::uint32_t) const {}
 
 } // namespace velmora

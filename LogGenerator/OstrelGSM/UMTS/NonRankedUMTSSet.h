@@ -11,8 +11,11 @@ namespace velmora {
 class NonRankedUMTSSet final : public Base {
 public:
     [[nodiscard]] std::string_view getSectionName() const override { return "Non-Ranked UMTS Set"; }
-    [[nodiscard]] std::vector<std::uint32_t> getLogCodeArray() const override { return {}; }
-    void updateWithData(const Data& data, std::uint32_t logCode) override;
+    [[nodiscard]] std::span<const View> views() const override;
+
+private:
+    void trace() const override;
+    void unknownCode(std::uint32_t logCode) const override;
 };
 
 } // namespace velmora

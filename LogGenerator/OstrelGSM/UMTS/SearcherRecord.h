@@ -21,12 +21,12 @@ public:
     static constexpr std::size_t measurementLength = 44;
 
     /// In a cell entry. Set type 0 is the active set.
-    static constexpr Where scramblingCode = bitsAt(7, 0, 13);
-    static constexpr Where setType = bitsAt(8, 5, 3);
+    static constexpr Place scramblingCode = bitsAt(7, 0, 13);
+    static constexpr Place setType = bitsAt(8, 5, 3);
     static_assert(scramblingCode.end() <= cellLength && setType.end() <= cellLength);
 
     /// In a measurement entry: three linear Ec/No values.
-    static constexpr Where energies[] = {u32At(32), u32At(36), u32At(40)};
+    static constexpr Place energies[] = {u32At(32), u32At(36), u32At(40)};
     static_assert(energies[2].end() <= measurementLength);
 
     explicit SearcherRecord(const Record& record)
@@ -41,7 +41,7 @@ public:
 
     /// A measurement's Ec/No: the first of its three values that is not zero.
     [[nodiscard]] static std::uint32_t energy(const Record& measurement) {
-        for (const Where& where : energies)
+        for (const Place& where : energies)
             if (const std::int64_t value = where.read(measurement); value != 0)
                 return static_cast<std::uint32_t>(value);
         return 0;

@@ -10,22 +10,39 @@ namespace velmora {
 
 using OstrelGSM::SearcherRecord;
 
-void SearcherSet::updateWithData(const Data& data, std::uint32_t logCode) {
-    logLine(LogPriority::Warning, traceName());
-    if (logCode != SearcherRecord::code) {
-        unknownLogMessage(logCode);
-        return;
-    }
-    const Record record(data);
-    if (record.size() < SearcherRecord::minimumLength)
-        return;
-    clearElements();
-    showCells(record, logCode);
+namespace {
+
+constexpr View sectionViews[] = {{SearcherRecord::code, SearcherRecord::minimumLength}};
+constexpr List rows{};
+
+} // namespace
+
+std::span<const View> SearcherSet::views() const {
+    return sectionViews;
 }
 
-void SearcherSet::showCells(const Record& record, std::uint32_t logCode) {
-    // Whatever set a cell is of, it gives no row here.
-    reportMissingEntries(SearcherRecord(record).cells(), logCode);
+void SearcherSet::trace() const {
+    logLine(LogPriority::Warning, traceName());
 }
+
+void SearcherSet::check(const View&, const Record& record) const {
+    checkCells(record);
+}
+
+void SearcherSet::decode(const View&, const Record& record, FieldVisitor& visitor) const {
+    visitor.beginList(rows);
+    visitCells(record, visitor);
+    visitor.endList();
+}
+
+void SearcherSet::checkCells(const Record& record) const {
+    reportMissingEntries(SearcherRecord(record).cells(), SearcherRecord::code);
+}
+
+std::size_t SearcherSet::neededLength(const View&, const Record&) const {
+    return 0;
+}
+
+void SearcherSet::visitCells(const Record&, FieldVisitor&) const {}
 
 } // namespace velmora

@@ -8,18 +8,25 @@
 namespace velmora {
 
 /// One of the UMTS searcher's four cell sets: a list that each record of the searcher replaces. A set that
-/// does not override `showCells` is never given a cell: it empties its list, and that is meant.
+/// does not override `checkCells` and `visitCells` is never given a cell, whatever set the cell is of: its
+/// list is empty, and that is meant.
 class SearcherSet : public Base {
 public:
-    [[nodiscard]] std::vector<std::uint32_t> getLogCodeArray() const final { return {0x417A}; }
-    void updateWithData(const Data& data, std::uint32_t logCode) final;
+    [[nodiscard]] std::span<const View> views() const final;
+    void decode(const View& view, const Record& record, FieldVisitor& visitor) const final;
 
 protected:
     /// What the set calls itself in the log.
     [[nodiscard]] virtual std::string_view traceName() const = 0;
-    /// Fills the list, which is empty, and tells of entries that the record lacks. Precondition: the record
-    /// has its minimum length.
-    virtual void showCells(const Record& record, std::uint32_t logCode);
+    /// Logs what the record lacks.
+    virtual void checkCells(const Record& record) const;
+    [[nodiscard]] std::size_t neededLength(const View& view, const Record& record) const override;
+    /// Names the rows of the list.
+    virtual void visitCells(const Record& record, FieldVisitor& visitor) const;
+
+private:
+    void trace() const final;
+    void check(const View& view, const Record& record) const final;
 };
 
 } // namespace velmora

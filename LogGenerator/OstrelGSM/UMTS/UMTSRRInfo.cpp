@@ -3,7 +3,6 @@
 
 #include "LogGenerator/OstrelGSM/UMTS/UMTSRRInfo.h"
 
-#include "LogGenerator/Extra/CellFields.h"
 #include "Platform/SystemLog.h"
 #include "Platform/TelephonyService.h"
 
@@ -24,10 +23,12 @@ constexpr Field stateFields[] = {
 };
 constexpr Layout state = layout(14, stateFields); // 0x4125
 
-constexpr std::size_t powerMinimumLength = 16; // 0x4031
+constexpr std::uint32_t powerCode = 0x4031;
+constexpr std::size_t powerMinimumLength = 16;
 constexpr std::size_t powerEntryLength = 14;
-constexpr Where powerTerm = i16At(4);
+constexpr Place powerTerm = i16At(4);
 static_assert(powerTerm.end() <= powerEntryLength);
+constexpr Field transmitPower{"Transmit Power", computed, real("%4.2lf dBm")};
 
 constexpr Field cellFields[] = {
     {"Cell ID", i32At(21), integer("%d")},
@@ -35,7 +36,8 @@ constexpr Field cellFields[] = {
     {"Uplink Frequency", i32At(13), integer("%d")},
     {"URA ID", u16At(25), integer("%d")},
 };
-constexpr Layout cell = layout(29, cellFields); // 0x4127
+constexpr Layout cell = layout(29, cellFields);
+constexpr std::uint32_t cellCode = 0x4127;
 
 constexpr Field cipheringFields[] = {
     {"Ciphering", u8At(13), flag("Enabled", "Disabled")},
@@ -50,12 +52,17 @@ constexpr CellField servingCellFields[] = {
     {kVoxCellMonitorSCN, CellNumber::Whole, "Scrambling Code", integer("%d"),
      "UMTSRRInfo: Failed to retrieve Scrambling Code\n"},
 };
+constexpr CellKind cellKinds[] = {
+    {kVoxCellMonitorRadioAccessTechnologyUMTS, kVoxCellMonitorCellTypeServing},
+};
+constexpr CellTable servingCell{cellKinds, CellTable::Shown::First, servingCellFields};
 
 CountedList powerEntries(const Record& record) {
     return CountedList(record, powerMinimumLength, powerEntryLength, record.u8(14));
 }
 
-void writeTransmitPower(Dictionary& node, const Record& record) {
+/// The mean of the transmit powers, in dBm.
+double meanPower(const Record& record) {
     const CountedList entries = powerEntries(record);
     int sum = 0;
     int count = 0;
@@ -69,48 +76,40 @@ void writeTransmitPower(Dictionary& node, const Record& record) {
     }
     // The mean of no term is not a number and shows as that, on purpose. Dividing zero by zero would give it
     // a sign that depends on the processor.
-    const double mean =
-        count != 0 ? static_cast<double>(sum) / count : std::numeric_limits<double>::quiet_NaN();
-    node.setText("Transmit Power", NumberText("%4.2lf dBm", mean).text());
+    return count != 0 ? static_cast<double>(sum) / count : std::numeric_limits<double>::quiet_NaN();
 }
+constexpr View sectionViews[] = {
+    {0x4125, state}, {powerCode, powerMinimumLength}, {cellCode, cell}, {0x4157, ciphering}, cellInformation,
+};
 
 } // namespace
 
-void UMTSRRInfo::updateWithData(const Data& data, std::uint32_t logCode) {
+std::span<const View> UMTSRRInfo::views() const {
+    return sectionViews;
+}
+
+void UMTSRRInfo::trace() const {
     logLine(LogPriority::Warning, "UMTSRRInfo");
-    const Record record(data);
-    switch (logCode) {
-    case 0x4125: show(record, state); break;
-    case 0x4031: showTransmitPower(record); break;
-    case 0x4127: showCell(record); break;
-    case 0x4157: show(record, ciphering); break;
-    case 0xFF0001: showServingCell(data); break;
-    default: unknownLogMessage(logCode);
+}
+
+const CellTable& UMTSRRInfo::cellTable() const {
+    return servingCell;
+}
+
+void UMTSRRInfo::check(const View& view, const Record& record) const {
+    if (view.code == powerCode)
+        reportMissingEntries(powerEntries(record), view.code);
+}
+
+void UMTSRRInfo::decode(const View& view, const Record& record, FieldVisitor& visitor) const {
+    if (view.code == powerCode) {
+        visitor.real(transmitPower, meanPower(record));
+        return;
     }
-}
-
-void UMTSRRInfo::showTransmitPower(const Record& record) {
-    if (record.size() < powerMinimumLength)
-        return;
-    reportMissingEntries(powerEntries(record), 0x4031);
-    showWith<writeTransmitPower>(record);
-}
-
-void UMTSRRInfo::showCell(const Record& record) {
-    if (!show(record, cell))
-        return;
+    CellSection::decode(view, record, visitor);
     // The telephony service's name for the downlink frequency goes when the baseband's arrives.
-    if (Dictionary* const node = dictionary())
-        node->removeLater("UARFCN");
-}
-
-void UMTSRRInfo::showServingCell(const Data& data) {
-    const std::vector<Cell>* cells = cellsOf(data);
-    if (!cells)
-        return;
-    if (const Cell* serving =
-            firstCell(*cells, {kVoxCellMonitorRadioAccessTechnologyUMTS, kVoxCellMonitorCellTypeServing}))
-        writeCellFields(dictionary(), *serving, servingCellFields);
+    if (view.code == cellCode)
+        visitor.removed("UARFCN");
 }
 
 } // namespace velmora

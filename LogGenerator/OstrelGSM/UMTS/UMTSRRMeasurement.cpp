@@ -7,8 +7,14 @@
 
 namespace velmora {
 
-void UMTSRRMeasurement::updateWithData(const Data&, std::uint32_t) {
+std::span<const View> UMTSRRMeasurement::views() const {
+    return {};
+}
+
+void UMTSRRMeasurement::trace() const {
     logLine(LogPriority::Warning, "UMTSRRMeasurement");
 }
+
+void UMTSRRMeasurement::unknownCode(std::uint32_t) const {}
 
 } // namespace velmora

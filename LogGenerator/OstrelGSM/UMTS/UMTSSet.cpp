@@ -3,7 +3,6 @@
 
 #include "LogGenerator/OstrelGSM/UMTS/UMTSSet.h"
 
-#include "LogGenerator/Extra/CellFields.h"
 #include "Platform/SystemLog.h"
 #include "Platform/TelephonyService.h"
 
@@ -13,7 +12,7 @@ namespace {
 
 constexpr std::size_t rankedMinimumLength = 15; // 0x4005
 // "GSM Set" reads other entries at the same place: which of the two counts is not zero tells what they are.
-constexpr Where rankedCount = u8At(13);
+constexpr Place rankedCount = u8At(13);
 static_assert(rankedCount.end() <= rankedMinimumLength);
 
 constexpr Field rankedFields[] = {
@@ -25,6 +24,12 @@ constexpr Field rankedFields[] = {
     {"Rank Cell RSCP", i16At(5), integer("%d dB")},
 };
 constexpr Layout ranked = layout(10, rankedFields);
+constexpr List rows{};
+
+CountedList rankedCells(const Record& record) {
+    return CountedList(record, rankedMinimumLength, ranked.minimumLength,
+                       static_cast<std::size_t>(rankedCount.read(record)));
+}
 
 constexpr CellField knownFields[] = {
     {kVoxCellMonitorUARFCN, CellNumber::Low16, "UARFCN", integer("%d"),
@@ -36,33 +41,38 @@ constexpr CellField knownFields[] = {
     {kVoxCellMonitorECN0, CellNumber::SignedLow16, "Energy Per Chip",
      unless(levelNotMeasured, "", integer("%d dB")), "UMTSSet: Failed to retrieve Energy Per Chip\n"},
 };
-constexpr CellRows known = {{kVoxCellMonitorRadioAccessTechnologyUMTS, kVoxCellMonitorCellTypeNeighbor},
-                            knownFields};
+constexpr CellKind knownKinds[] = {
+    {kVoxCellMonitorRadioAccessTechnologyUMTS, kVoxCellMonitorCellTypeNeighbor},
+};
+constexpr CellTable known{knownKinds, CellTable::Shown::Rows, knownFields};
+constexpr View sectionViews[] = {
+    {0x4005, rankedMinimumLength},
+    cellInformation,
+};
 
 } // namespace
 
-void UMTSSet::updateWithData(const Data& data, std::uint32_t logCode) {
+std::span<const View> UMTSSet::views() const {
+    return sectionViews;
+}
+
+void UMTSSet::trace() const {
     logLine(LogPriority::Warning, "UMTSSet");
-    switch (logCode) {
-    case 0x4005: showRankedCells(Record(data)); break;
-    case 0xFF0001: showKnownCells(data); break;
-    default: unknownLogMessage(logCode);
-    }
 }
 
-void UMTSSet::showRankedCells(const Record& record) {
-    if (record.size() < rankedMinimumLength)
-        return;
-    const CountedList entries(record, rankedMinimumLength, ranked.minimumLength,
-                              static_cast<std::size_t>(rankedCount.read(record)));
-    showRows(entries, ranked, 0x4005);
+const CellTable& UMTSSet::cellTable() const {
+    return known;
 }
 
-void UMTSSet::showKnownCells(const Data& data) {
-    if (const std::vector<Cell>* cells = cellsOf(data))
-        writeCellRows(array(), *cells, known, _knownCells);
+void UMTSSet::check(const View& view, const Record& record) const {
+    reportMissingEntries(rankedCells(record), view.code);
+}
+
+void UMTSSet::decode(const View& view, const Record& record, FieldVisitor& visitor) const {
+    if (view.code == cellInformation.code)
+        CellSection::decode(view, record, visitor);
     else
-        clearElements();
+        visitor.rows(rows, rankedCells(record), ranked);
 }
 
 } // namespace velmora

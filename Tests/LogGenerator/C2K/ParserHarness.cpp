@@ -3,6 +3,7 @@
 
 #include "Tests/LogGenerator/C2K/ParserHarness.h"
 
+#include "LogGenerator/C2K/LookupWriter.h"
 #include "Tests/Support/Hex.h"
 
 #include <gtest/gtest.h>
@@ -59,7 +60,6 @@ ParserHarness::ParserHarness() {
         target->set("dict", _display);
         _lookup->set(key, std::make_shared<Array>(Array{target}));
     }
-    _targets.use(_lookup);
 }
 
 ParserHarness& ParserHarness::update(const Data& record) {
@@ -68,7 +68,10 @@ ParserHarness& ParserHarness::update(const Data& record) {
     const C2K::LogCodeParser* parser = C2K::parserOfCode(header.u16(3));
     if (!parser)
         throw std::invalid_argument("a record that no parser takes");
-    parser->parse(header, state, C2K::Publisher(_targets));
+    if (const std::optional<C2K::Reading> reading = parser->accept(header, state)) {
+        C2K::LookupWriter writer(*_lookup);
+        parser->decode(*reading, writer);
+    }
     _lines = log.lines();
     return *this;
 }

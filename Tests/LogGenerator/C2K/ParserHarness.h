@@ -55,7 +55,6 @@ public:
 private:
     DictionaryRef _display = makeDictionary();
     DictionaryRef _lookup = makeDictionary();
-    C2K::Targets _targets;
     LogLines _lines;
 };
 

@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: MIT
 
 #include "LogGenerator/LTE/LTEClassIndex.h"
+#include "LogMessages/LogMessage.h"
 #include "Tests/LogGenerator/SectionHarness.h"
 
 #include <gtest/gtest.h>
@@ -88,7 +89,7 @@ TEST_F(LTESectionContract, AnUnhandledCodeIsReportedAndChangesNothing) {
 TEST_F(LTESectionContract, AShortRecordLeavesTheTraceWordAlone) {
     for (const LTEContract& contract : contracts)
         for (const std::uint32_t code : contract.codes) {
-            if (code >= firstExtraCode)
+            if (code >= LogMessage::firstExtraCode)
                 continue; // has no minimum
             for (const std::size_t length : {0u, 11u, 13u, 20u})
                 EXPECT_EQ(update(section(contract), Data(std::vector<std::uint8_t>(length)), code),
@@ -101,7 +102,7 @@ TEST_F(LTESectionContract, WithoutANodeNothingIsWritten) {
     const Data full = recordWith(0, 300, {{19, 1}, {27, 1}, {28, 1}});
     for (const LTEContract& contract : contracts)
         for (const std::uint32_t code : contract.codes) {
-            const bool array = code >= firstExtraCode;
+            const bool array = code >= LogMessage::firstExtraCode;
             const LogLines lines =
                 update(section(contract), array ? cellInfo({cell("LTE", "Serving")}) : full, code);
             ASSERT_FALSE(lines.empty());

@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: MIT
 
 #include "LogGenerator/OstrelGSM/Ostrel_GSMClassIndex.h"
+#include "LogMessages/LogMessage.h"
 #include "Tests/LogGenerator/SectionHarness.h"
 
 #include <gtest/gtest.h>
@@ -106,7 +107,7 @@ TEST_F(SectionContract, TheCodeShowsAsASignedNumber) {
 TEST_F(SectionContract, AShortRecordLeavesTheTraceWordAlone) {
     for (const Contract& contract : contracts) {
         for (const std::uint32_t code : contract.codes) {
-            if (code >= firstExtraCode)
+            if (code >= LogMessage::firstExtraCode)
                 continue; // has no minimum
             for (const std::size_t length : {11u, 13u}) {
                 EXPECT_EQ(update(section(contract), Data(std::vector<std::uint8_t>(length)), code),
@@ -123,7 +124,8 @@ TEST_F(SectionContract, WithoutANodeNothingIsWritten) {
                                  cell("GSM", "Neighbor"), cell("UMTS", "Neighbor")});
     for (const Contract& contract : contracts)
         for (const std::uint32_t code : contract.codes) {
-            const LogLines lines = update(section(contract), code < firstExtraCode ? full : cells, code);
+            const LogLines lines =
+                update(section(contract), code < LogMessage::firstExtraCode ? full : cells, code);
             ASSERT_FALSE(lines.empty());
             EXPECT_EQ(lines.front(), (CapturedLog::Line{LogPriority::Warning, contract.trace}));
             // What the cells lack is reported all the same.

@@ -40,8 +40,11 @@ TEST(GSMNeighbhorMeasurements, MakesARowOfEachCell) {
         all += all.empty() ? "" : ", ";
         all += row;
     }
-    EXPECT_EQ(shown(std::make_shared<Array>(GSMNeighbhorMeasurements::neighbours(Record(full)))),
-              "[" + all + "]");
+    const ArrayRef list = makeArray();
+    DisplayWriter::SpareRows spare;
+    DisplayWriter writer(*list, spare);
+    GSMNeighbhorMeasurements::visitNeighbours(Record(full), writer);
+    EXPECT_EQ(shown(list), "[" + all + "]");
 }
 
 TEST(GSMNeighbhorMeasurements, TheListIsEmptyAfterEveryRecord) {

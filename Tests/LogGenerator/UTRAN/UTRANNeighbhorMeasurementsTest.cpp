@@ -107,10 +107,11 @@ TEST(UTRANNeighbhorMeasurements, NoCellsEmptyTheListThatStaysTheSame) {
     SectionHarness section = make();
     const ArrayRef node = section.value().arrayRef();
     section.update(recordWith(0xD00A, 21));
-    EXPECT_TRUE(node->empty());
+    EXPECT_EQ(section.node(), "[]");
     EXPECT_THAT(section.errors(), IsEmpty());
     section.update(five(5 << 1));
-    EXPECT_EQ(node->size(), 5u);
+    EXPECT_EQ(section.value().asArray()->size(), 5u);
+    EXPECT_EQ(section.value().asArray(), node.get());
 }
 
 } // namespace

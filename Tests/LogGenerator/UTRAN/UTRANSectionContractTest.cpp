@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: MIT
 
 #include "LogGenerator/UTRAN/UTRANClassIndex.h"
+#include "LogMessages/LogMessage.h"
 #include "Tests/LogGenerator/SectionHarness.h"
 
 #include <gtest/gtest.h>
@@ -84,8 +85,9 @@ TEST_F(UTRANSectionContract, WithoutANodeNothingIsWritten) {
     const Data full = recordWith(0, 3000, {{13, 1}, {14, 0xFF}, {15, 0xFF}, {16, 0xFF}});
     for (const Contract& contract : contracts)
         for (const std::uint32_t code : contract.codes) {
-            const LogLines lines = update(
-                section(contract), code < firstExtraCode ? full : cellInfo({cell("UTRAN", "Serving")}), code);
+            const LogLines lines =
+                update(section(contract),
+                       code < LogMessage::firstExtraCode ? full : cellInfo({cell("UTRAN", "Serving")}), code);
             ASSERT_FALSE(lines.empty());
             EXPECT_EQ(lines.front(), contract.trace);
             // The RRC state's own line, and what the cell lacks.

@@ -59,7 +59,7 @@ TEST_F(C2KDisplayTest, everyLabelIsFilledAndPlausible) {
     for (const ScenarioEvent& event : twentyMinutes()) {
         decoder->updateState(state, event.message);
         if (++count % 10 == 0)
-            collect(state["Display"], "", texts);
+            collect(decoder->display(state), "", texts);
     }
     const char* const level = "[+-][0-9]+ dBm|N/A";
     const char* const fineLevel = "[+-][0-9]+\\.[0-9][0-9] dBm|N/A";

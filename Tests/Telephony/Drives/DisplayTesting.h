@@ -45,10 +45,10 @@ protected:
     }
 
     /// A section's node, at the top of the display or in a group.
-    [[nodiscard]] const Value& node(std::string_view section) const {
-        return (*state["Display"].asDictionary())[section];
+    [[nodiscard]] const Value& node(std::string_view section) {
+        return (*decoder->display(state).asDictionary())[section];
     }
-    [[nodiscard]] const Value& node(std::string_view group, std::string_view section) const {
+    [[nodiscard]] const Value& node(std::string_view group, std::string_view section) {
         return (*node(group).asDictionary())[section];
     }
     /// What a dictionary shows under a label.

@@ -13,8 +13,8 @@
 #include <memory>
 #include <string>
 
-// What a drive shows does not depend on when somebody looks: sections hand their records to the display,
-// which turns them into text only then.
+// What a drive shows does not depend on how often the display is asked for, although sections write their
+// latest records only then: not its texts and not the order of its keys.
 
 namespace velmora {
 namespace {
@@ -24,6 +24,22 @@ struct Decoding {
     std::unique_ptr<LogGenerator> decoder;
     Dictionary state;
 };
+
+/// The value with its keys in their order, on one line.
+std::string inOrder(const Value& value) {
+    if (const std::string* text = value.asString())
+        return *text;
+    std::string result;
+    if (const Dictionary* dictionary = value.asDictionary())
+        for (const auto& [key, entry] : *dictionary)
+            result += key + "=" + inOrder(entry) + ";";
+    if (const Array* array = value.asArray())
+        for (const Value& element : *array)
+            result += inOrder(element) + ",";
+    if (const Data* data = value.asData())
+        result.assign(data->bytes().begin(), data->bytes().end());
+    return "(" + result + ")";
+}
 
 class LateDisplayTest : public testing::TestWithParam<const char*> {
 protected:
@@ -41,7 +57,7 @@ protected:
     FakeResources resources;
 };
 
-TEST_P(LateDisplayTest, LookingAtEveryMessageChangesNothing) {
+TEST_P(LateDisplayTest, AskingForItAtEveryMessageChangesNothing) {
     const std::unique_ptr<Scenario> scenario = scenarioKindNamed(GetParam())->make(7);
     Decoding watched = decoding(scenario->technology());
     Decoding late = decoding(scenario->technology());
@@ -50,8 +66,7 @@ TEST_P(LateDisplayTest, LookingAtEveryMessageChangesNothing) {
         const ScenarioEvent event = scenario->next();
         watched.decoder->updateState(watched.state, event.message);
         late.decoder->updateState(late.state, event.message);
-        // Comparing looks at every value there is.
-        EXPECT_EQ(watched.state["Display"], watched.state["Display"].copy());
+        static_cast<void>(watched.decoder->display(watched.state));
         if (i % 20 != 19)
             continue;
         static_cast<void>(watched.decoder->generateLogUsingState(watched.state));
@@ -60,10 +75,9 @@ TEST_P(LateDisplayTest, LookingAtEveryMessageChangesNothing) {
             continue;
         // Five entries, the oldest made 80 messages ago.
         ASSERT_EQ(late.state["History"].asArray()->size(), 5u);
-        ASSERT_EQ(late.state["History"], watched.state["History"]) << "after message " << i;
-        if (i % 300 == 299) {
-            ASSERT_EQ(late.state["Display"], watched.state["Display"]) << "after message " << i;
-        }
+        ASSERT_EQ(inOrder(late.state["History"]), inOrder(watched.state["History"])) << "after " << i;
+        ASSERT_EQ(inOrder(late.decoder->display(late.state)), inOrder(watched.state["Display"]))
+            << "after message " << i;
     }
 }
 

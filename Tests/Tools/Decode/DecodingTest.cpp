@@ -68,7 +68,7 @@ protected:
     };
 
     struct Observer final : DecodingObserver {
-        void messageDecoded(const LoggedMessage&, const Dictionary&) override { ++messages; }
+        void messageDecoded(const LoggedMessage&, LogGenerator&, Dictionary&) override { ++messages; }
         void refreshed(Time tick, const Decoded& decoded) override {
             const Dictionary* section = (*decoded.display.asDictionary())["GSM RR Info"].asDictionary();
             refreshes.push_back({tick, *(*section)["RR State"].asString()});
@@ -125,7 +125,7 @@ TEST_F(DecodingTest, RefreshesAtTheTicksThatHaveHadMessages) {
 TEST_F(DecodingTest, KeepsTheHistoryForThoseWhoWantIt) {
     struct Ended final : DecodingObserver {
         explicit Ended(bool wanted) : wantsIt(wanted) {}
-        [[nodiscard]] bool wantsHistory() const override { return wantsIt; }
+        [[nodiscard]] bool wantsHistory(std::uint64_t) const override { return wantsIt; }
         void ended(const LogGenerator&, const Dictionary& state) override {
             const Array* history = state["History"].asArray();
             entries = history ? history->size() : 0;

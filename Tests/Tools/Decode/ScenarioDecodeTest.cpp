@@ -68,7 +68,7 @@ TEST_F(ToolTest, RecordedDriveFillsEverySectionButThoseThatStayEmpty) {
         messages.push_back({at(0) + event.offset, event.message});
         decoder->updateState(state, event.message);
         empty.clear();
-        collectEmpty(state["Display"], empty);
+        collectEmpty(decoder->display(state), empty);
     }
     setResources(earlier);
 

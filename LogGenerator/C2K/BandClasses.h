@@ -1,13 +1,13 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "LogGenerator/C2K/NumberedTexts.h"
+#pragma once
+
+#include "LogGenerator/Fields/EnumTexts.h"
 
 namespace velmora::C2K {
 
-namespace {
-
-constexpr EnumText bandClassRows[] = {
+inline constexpr EnumText bandClassRows[] = {
     {0, "800 MHz cellular band [0]"},
     {1, "1.8 to 2.0GHz PCS band [1]"},
     {2, "872 to 960MHz TACS band [2]"},
@@ -22,18 +22,7 @@ constexpr EnumText bandClassRows[] = {
     {11, "400 MHz European PAMR band [11]"},
     {12, "800 MHz European PAMR band [12]"},
 };
-
-} // namespace
-
-constexpr NumberedTexts bandClasses(bandClassRows, "[Bad Value ", "]");
-
-std::string NumberedTexts::operator[](std::uint32_t value) const {
-    if (const std::string_view text = _texts[value]; !text.empty())
-        return std::string(text);
-    std::string text(_before);
-    text += std::to_string(static_cast<std::int32_t>(value));
-    text += _after;
-    return text;
-}
+/// The band classes of both radio systems (3GPP2 C.S0057, 1.5).
+inline constexpr EnumTexts bandClasses(bandClassRows, "[Bad Value ", "]");
 
 } // namespace velmora::C2K

@@ -1,0 +1,27 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include "LogGenerator/Fields/Field.h"
+
+#include <cstddef>
+#include <cstdint>
+
+namespace velmora {
+
+/// One log code that a section wants, and what it reads there: a table, or more than a table says, which the
+/// section's `decode` then names. A section's views are its subscriptions, in the order of registration.
+struct View {
+    /// A table, which must be a constant.
+    constexpr View(std::uint32_t logCode, const Layout& layout)
+        : code(logCode), minimumLength(layout.minimumLength), table(&layout) {}
+    /// `decode` reads a record of at least this length.
+    constexpr View(std::uint32_t logCode, std::size_t minimum) : code(logCode), minimumLength(minimum) {}
+
+    std::uint32_t code;
+    std::size_t minimumLength; ///< a shorter record is ignored without a log line
+    const Layout* table = nullptr;
+};
+
+} // namespace velmora

@@ -1,0 +1,24 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
+#include "Tools/Decode/Refreshes.h"
+
+namespace velmora {
+
+std::uint64_t countRefreshes(MessageReader& reader) {
+    Refreshes refreshes;
+    for (;;) {
+        const std::optional<LoggedMessage> message = reader.next();
+        if (!message)
+            break;
+        if (refreshes.before(*message))
+            refreshes.done();
+        if (refreshes.after(*message))
+            refreshes.done();
+    }
+    if (refreshes.last())
+        refreshes.done();
+    return refreshes.count();
+}
+
+} // namespace velmora

@@ -1,0 +1,55 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include "Platform/Clock.h"
+#include "Recording/MessageReader.h"
+#include "Tools/Decode/RecordedTime.h"
+
+#include <cstdint>
+#include <optional>
+
+namespace velmora {
+
+/// When a file's display is refreshed while its messages are decoded one after the other: on the grid of
+/// RecordedTicks, or where the file itself says when (a snapshot does).
+class Refreshes {
+public:
+    /// The refresh that is due before this message is decoded, if any.
+    [[nodiscard]] std::optional<Time> before(const LoggedMessage& message) {
+        _fileTells = _fileTells || message.refresh;
+        const std::optional<Time> tick = _ticks.before(message.time);
+        return tick && !_fileTells ? tick : std::nullopt;
+    }
+    /// The message, which is not decoded, is passed over: the refresh that is due after it, if any.
+    [[nodiscard]] std::optional<Time> afterSkipped(const LoggedMessage& message) {
+        _fileTells = _fileTells || message.refresh;
+        return _isPending ? message.refresh : std::nullopt;
+    }
+    /// The message has been decoded: the refresh that is due after it, if any.
+    [[nodiscard]] std::optional<Time> after(const LoggedMessage& message) {
+        _isPending = true;
+        return message.refresh;
+    }
+    /// The refresh that follows the last message; none where there has been one since.
+    [[nodiscard]] std::optional<Time> last() const { return _isPending ? _ticks.last() : std::nullopt; }
+
+    /// There was a refresh.
+    void done() {
+        _isPending = false;
+        ++_count;
+    }
+    [[nodiscard]] std::uint64_t count() const { return _count; }
+
+private:
+    RecordedTicks _ticks;
+    bool _fileTells = false; ///< and then its refreshes are all there are
+    bool _isPending = false; ///< a message has been decoded since the last refresh
+    std::uint64_t _count = 0;
+};
+
+/// How many refreshes decoding all messages takes, from where the reader stands to its end.
+[[nodiscard]] std::uint64_t countRefreshes(MessageReader& reader);
+
+} // namespace velmora
