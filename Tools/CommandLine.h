@@ -5,11 +5,11 @@
 
 #include "Platform/Linux/ProgramLog.h"
 #include "Platform/SystemLog.h"
-#include "Tools/Convert/ConvertCommand.h"
-#include "Tools/Decode/DecodeCommand.h"
-#include "Tools/Info/InfoCommand.h"
-#include "Tools/Record/RecordCommand.h"
-#include "Tools/Watch/WatchCommand.h"
+#include "Tools/Convert/ConvertOptions.h"
+#include "Tools/Decode/DecodeOptions.h"
+#include "Tools/Info/InfoOptions.h"
+#include "Tools/Record/RecordOptions.h"
+#include "Tools/Watch/WatchOptions.h"
 
 #include <string>
 #include <variant>

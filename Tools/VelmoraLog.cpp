@@ -6,9 +6,14 @@
 #include "Platform/Console.h"
 #include "Platform/Linux/Files/FileResources.h"
 #include "Tools/CommandLine.h"
+#include "Tools/Convert/ConvertCommand.h"
+#include "Tools/Decode/DecodeCommand.h"
 #include "Tools/ExitStatus.h"
+#include "Tools/Info/InfoCommand.h"
 #include "Tools/Output.h"
+#include "Tools/Record/RecordCommand.h"
 #include "Tools/Report.h"
+#include "Tools/Watch/WatchCommand.h"
 
 #include <csignal>
 #include <cstdio>

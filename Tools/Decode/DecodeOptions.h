@@ -10,6 +10,10 @@
 #include <string>
 #include <vector>
 
+namespace CLI {
+class App;
+}
+
 namespace velmora {
 
 /// `velmora-log decode`: runs each file through its technology's decoder and shows what the screens show.
@@ -30,5 +34,8 @@ struct DecodeOptions {
     std::size_t jobs = 1;   ///< how many files are decoded side by side
     std::vector<std::string> files;
 };
+
+/// Adds the command with its options, help and examples. Parsing fills `options`, which must outlive `app`.
+CLI::App* addDecode(CLI::App& app, DecodeOptions& options);
 
 } // namespace velmora
