@@ -5,9 +5,9 @@
 
 #include "Recording/OpenMessages.h"
 #include "Tools/Decode/CSVRows.h"
-#include "Tools/Decode/DecodeJobs.h"
 #include "Tools/Decode/DecodeProgress.h"
 #include "Tools/Decode/DecodeWriter.h"
+#include "Tools/Decode/Jobs/JobScheduler.h"
 #include "Tools/ExitStatus.h"
 #include "Tools/LogSubstitute.h"
 #include "Tools/Output.h"
@@ -104,9 +104,10 @@ int runDecode(const DecodeOptions& options, Output& output) {
     const std::size_t jobs = standardInputs > 1 ? 1 : std::min(options.jobs, options.files.size());
     bool good = true;
     if (jobs > 1) {
-        good = runDecodeJobs(
-            options.files.size(), jobs,
-            [&](std::size_t index, Output& part) { return decodeFile(index, options, false, part); }, output);
+        const Job job = [&](std::size_t index, Output& part) {
+            return decodeFile(index, options, false, part);
+        };
+        good = JobScheduler(options.files.size(), jobs, job, output).run();
     } else {
         for (std::size_t index = 0; index < options.files.size() && output.isOpen(); ++index)
             good = decodeFile(index, options, true, output) && good;
