@@ -3,6 +3,7 @@
 
 #include "Tools/Text/JSONText.h"
 
+#include "Platform/Base64.h"
 #include "Platform/DateText.h"
 #include "Platform/UTF8.h"
 
@@ -128,16 +129,10 @@ void appendReal(TextBuffer& out, double real) {
 }
 
 void appendBase64(TextBuffer& out, Bytes bytes) {
-    static constexpr char digits[] = "ABCDEFGHIJKLMNOPQRSTUVWXYZabcdefghijklmnopqrstuvwxyz0123456789+/";
+    const std::size_t size = base64Size(bytes.size());
     out.append('"');
-    for (std::size_t i = 0; i < bytes.size(); i += 3) {
-        const std::size_t present = std::min<std::size_t>(bytes.size() - i, 3);
-        std::uint32_t group = 0;
-        for (std::size_t j = 0; j < 3; ++j)
-            group = group << 8 | (j < present ? bytes[i + j] : 0U);
-        for (std::size_t j = 0; j < 4; ++j)
-            out.append(j <= present ? digits[group >> (18 - 6 * j) & 0x3F] : '=');
-    }
+    putBase64(out.room(size), bytes);
+    out.advance(size);
     out.append('"');
 }
 
