@@ -4,13 +4,13 @@
 #include "PropertyLists/XMLScalars.h"
 
 #include "Platform/Base64.h"
+#include "Platform/DateText.h"
 #include "PropertyLists/PropertyListDate.h"
 #include "PropertyLists/XMLText.h"
 
 #include <algorithm>
 #include <charconv>
 #include <cmath>
-#include <cstdio>
 #include <limits>
 #include <utility>
 #include <vector>
@@ -118,41 +118,14 @@ std::string xmlOfReal(double real) {
 }
 
 std::optional<Date> dateOfXML(std::string_view text) {
-    constexpr std::string_view form = "0000-00-00T00:00:00Z";
-    if (text.size() != form.size())
+    if (!text.ends_with('Z'))
         return std::nullopt;
-    for (std::size_t i = 0; i < form.size(); ++i)
-        if (form[i] == '0' ? !isDigit(text[i]) : text[i] != form[i])
-            return std::nullopt;
-    const auto number = [text](std::size_t offset, std::size_t size) {
-        int result = 0;
-        for (const char digit : text.substr(offset, size))
-            result = 10 * result + (digit - '0');
-        return result;
-    };
-    const std::chrono::year_month_day day(std::chrono::year(number(0, 4)),
-                                          std::chrono::month(static_cast<unsigned>(number(5, 2))),
-                                          std::chrono::day(static_cast<unsigned>(number(8, 2))));
-    const int hours = number(11, 2);
-    const int minutes = number(14, 2);
-    const int seconds = number(17, 2);
-    if (!day.ok() || hours > 23 || minutes > 59 || seconds > 59)
-        return std::nullopt;
-    const Date date = std::chrono::sys_days(day) + std::chrono::hours(hours) + std::chrono::minutes(minutes) +
-                      std::chrono::seconds(seconds);
-    return isPropertyListDate(date) ? std::optional(date) : std::nullopt;
+    const std::optional<Date> date = momentOfText(text.substr(0, text.size() - 1), 'T');
+    return date && isPropertyListDate(*date) ? date : std::nullopt;
 }
 
 std::string xmlOfDate(Date date) {
-    const auto midnight = std::chrono::floor<std::chrono::days>(date);
-    const std::chrono::year_month_day day(midnight);
-    const std::chrono::hh_mm_ss time(date - midnight);
-    char text[64];
-    std::snprintf(text, sizeof text, "%04d-%02u-%02uT%02d:%02d:%02dZ", static_cast<int>(day.year()),
-                  static_cast<unsigned>(day.month()), static_cast<unsigned>(day.day()),
-                  static_cast<int>(time.hours().count()), static_cast<int>(time.minutes().count()),
-                  static_cast<int>(time.seconds().count()));
-    return text;
+    return isoText(date);
 }
 
 std::optional<Data> dataOfXML(std::string_view text) {

@@ -136,21 +136,12 @@ void appendBase64(TextBuffer& out, Bytes bytes) {
     out.append('"');
 }
 
-void appendDate(TextBuffer& out, Date date) {
-    // "2026-11-16 05:00:00 +0000" with the standard's separators. The description holds every year's digits.
-    std::string text = dateDescription(date);
-    text.resize(text.rfind(' '));
-    text += 'Z';
-    text[text.find(' ')] = 'T';
-    appendJsonString(out, text);
-}
-
 void appendScalar(TextBuffer& out, const Value& value) {
     switch (value.kind()) {
     case ValueKind::Integer: appendNumber(out, *value.asInteger()); break;
     case ValueKind::Real: appendReal(out, *value.asReal()); break;
     case ValueKind::Boolean: out.append(*value.asBoolean() ? "true" : "false"); break;
-    case ValueKind::Date: appendDate(out, *value.asDate()); break;
+    case ValueKind::Date: appendJsonString(out, isoText(*value.asDate())); break;
     case ValueKind::Data: appendBase64(out, value.asData()->bytes()); break;
     default: out.append("null"); break;
     }
