@@ -14,8 +14,8 @@ namespace velmora {
 /// a byte that is no UTF-8 becomes U+FFFD. Text without any of these is unchanged.
 [[nodiscard]] std::string printable(std::string_view text);
 
-/// The terminal columns that printable text takes: none for combining marks, two for East Asian wide
-/// characters and emoji, otherwise one a character.
+/// The terminal columns that printable text takes, as Unicode has them: none for combining marks, two for
+/// East Asian wide characters and emoji, otherwise one a character.
 [[nodiscard]] std::size_t displayWidth(std::string_view text);
 
 /// As much of the front of printable text as fits into `columns`; what had to be cut ends in "…".
