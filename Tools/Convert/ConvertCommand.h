@@ -7,7 +7,7 @@
 
 namespace velmora {
 
-/// The exit status. Trouble with the input does not keep what could be read from being converted.
+/// Returns the exit status. Errors in the input do not keep what could be read from being converted.
 [[nodiscard]] int runConvert(const ConvertOptions& options);
 
 } // namespace velmora

@@ -30,7 +30,7 @@ void addBound(CLI::App& command, const std::string& name, std::optional<TimeBoun
         ->type_name("TIME");
 }
 
-/// Options that say nothing together.
+/// Refuses options that make no sense together.
 void checkTogether(const DecodeOptions& options) {
     using Format = DecodeOptions::Format;
     const bool hasSelection = !options.selection.paths().empty();

@@ -28,7 +28,7 @@ struct DecodeOptions {
 
     Format format = Format::Text;
     Every every = Every::Refresh; ///< `Message` for JsonLines and Csv alone
-    NodeSelection selection;      ///< not empty for Csv; empty where JsonLines tells of messages
+    NodeSelection selection;      ///< not empty for Csv; empty for JsonLines with `Message`
     TimeRange range;
     std::string technology; ///< before the one that the file names; empty for that one
     std::size_t jobs = 1;   ///< how many files are decoded side by side

@@ -9,7 +9,7 @@ namespace velmora {
 
 class Output;
 
-/// The exit status.
+/// Returns the exit status.
 [[nodiscard]] int runInfo(const InfoOptions& options, Output& output);
 
 } // namespace velmora

@@ -15,13 +15,13 @@ namespace velmora {
 
 namespace {
 
-/// Tells what has been recorded, and what has not. The exit status.
+/// Reports what has been recorded, and what has not. Returns the exit status.
 int sumUp(const RecordingSession& recording, const std::string& file, int status) {
     const recordingBlocks::PacketCount unsaved = recording.unsaved();
     report("recorded " + std::to_string(recording.messages() - unsaved.messages) + " messages of " +
            recording.technology() + ", " + std::to_string(recording.bytes() - unsaved.bytes) + " bytes");
     const std::uint64_t missing = unsaved.messages + recording.dropped();
-    // Messages that a pipe's reader did not wait for are none that it misses.
+    // A pipe's reader that has closed it does not miss messages.
     if (missing == 0 || recording.hasLostReader())
         return status;
     report(std::to_string(missing) + " messages are missing from " + file);

@@ -7,7 +7,7 @@
 
 namespace velmora {
 
-/// The exit status.
+/// Returns the exit status.
 [[nodiscard]] int runRecord(const RecordOptions& options);
 
 } // namespace velmora

@@ -9,7 +9,7 @@ namespace velmora {
 
 namespace {
 
-/// No more than the event loop's timers hold, which is 24 days.
+/// At most what the event loop's timers hold, which is 24 days.
 CLI::Validator wantsSeconds() {
     return wants(
         [](const std::string& text) {

@@ -117,7 +117,7 @@ void Recorder::serviceIsGone() {
     _news.tell(std::string(serviceTitle) + " is gone; waiting for it");
 }
 
-/// Ends the recording on a failure, after telling the user. Whether there was none.
+/// Ends the recording on a failure, after reporting it. Returns whether there was none.
 bool Recorder::check(const Result<Done>& result) {
     if (result) {
         _news.tellTrouble();

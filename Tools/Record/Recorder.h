@@ -21,7 +21,7 @@ public:
     /// All three must outlive this.
     Recorder(const RecordOptions& options, RecordingSession& session, ServiceClient& client);
 
-    /// Runs the client's event loop. The exit status.
+    /// Runs the client's event loop. Returns the exit status.
     int run();
 
 private:

@@ -36,8 +36,8 @@ constexpr std::array<bool, 256> plainBytes = []() {
 /// Eight bytes at a time: nearly all of what is written is plain, and in pieces of some ten bytes.
 using Word = std::uint64_t;
 
-/// Whether a byte of the word is not plain. The tests for zero and for less may blame a byte above one that
-/// they blame rightly, which changes nothing.
+/// Whether a byte of the word is not plain. The tests for zero and for less may also flag a byte above one
+/// that they flag rightly, which does not change the result.
 bool hasUnusual(Word word) {
     constexpr Word ones = 0x0101010101010101;
     constexpr Word tops = 0x8080808080808080;
@@ -56,9 +56,9 @@ bool copyPlainWord(char* to, const char* from) {
     return !hasUnusual(word);
 }
 
-/// Copies the text up to the first byte that is not plain, at most. Gives the number of bytes; those behind
-/// may have been written to as well, up to the text's length. All plain bytes up to there are only promised
-/// where the whole text is.
+/// Copies the text, at most up to the first byte that is not plain. Returns the number of bytes; those after
+/// them, up to the text's length, may have been written to as well. It may stop short of that byte, but not
+/// where the whole text is plain.
 std::size_t copyPlain(char* to, std::string_view text) {
     std::size_t done = 0;
     for (; text.size() - done >= sizeof(Word); done += sizeof(Word))

@@ -75,7 +75,7 @@ std::string composeFrame(const std::vector<TreeRow>& rows, std::string_view stat
             column = start + displayWidth(text);
             frame += rows[index].isBranch ? bold + text + plain : text;
         }
-        // After a full line the cursor still stands on its last character, which clearing would take away.
+        // After a full line the cursor is still on its last character, which clearing would erase.
         if (column < size.columns)
             frame += clearToEndOfLine;
         frame += "\r\n";
@@ -112,7 +112,7 @@ std::vector<Key> KeyReader::take(std::string_view bytes) {
                         [this](const Sequence& sequence) { return sequence.bytes.starts_with(_pending); });
         if (begun)
             break;
-        // A key that means nothing here: its sequence goes as a whole, so that its last letter is no key.
+        // An unknown key: its sequence is skipped as a whole, so that its last letter is not read as a key.
         std::size_t length = 1;
         if (_pending[0] == '\x1b' && _pending.size() > 1 && (_pending[1] == '[' || _pending[1] == 'O')) {
             const std::size_t end =

@@ -12,7 +12,7 @@
 
 namespace velmora {
 
-/// What a terminal shows of the display tree, as plain functions: no terminal is needed to say what is on it.
+/// What a terminal shows of the display tree, as plain functions that need no terminal.
 
 struct ScreenSize {
     std::size_t columns = 80;
@@ -46,14 +46,14 @@ inline constexpr std::size_t columnGap = 3;
 /// A key that means something to the screen.
 enum class Key { Up, Down, PageUp, PageDown, Home, End, Quit };
 
-/// Tells keys from the bytes that a terminal sends for them. Sequences may come in pieces; what means nothing
-/// is passed over.
+/// Reads keys from the bytes that a terminal sends for them. Sequences may come in pieces; unknown ones are
+/// skipped.
 class KeyReader {
 public:
     [[nodiscard]] std::vector<Key> take(std::string_view bytes);
 
 private:
-    std::string _pending; ///< the beginning of a sequence
+    std::string _pending; ///< an incomplete sequence
 };
 
 /// Where the screen is scrolled to after a key. `Quit` scrolls nowhere.

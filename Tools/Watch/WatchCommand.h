@@ -9,8 +9,8 @@ namespace velmora {
 
 class Output;
 
-/// The exit status. Draws on the terminal where standard output is one, prints each refresh to `output`
-/// otherwise.
+/// Returns the exit status. Draws on the terminal where standard output is one, prints each refresh to
+/// `output` otherwise.
 [[nodiscard]] int runWatch(const WatchOptions& options, Output& output);
 
 } // namespace velmora
