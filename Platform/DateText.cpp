@@ -9,18 +9,18 @@ namespace velmora {
 
 namespace {
 
+using namespace std::chrono;
+
+constexpr std::string_view dayForm = "dddd-dd-dd"; // d: a digit
+constexpr std::string_view timeForm = "dd:dd:dd";
+
 void appendTwoDigits(std::string& text, unsigned number) {
     text += static_cast<char>('0' + number / 10);
     text += static_cast<char>('0' + number % 10);
 }
 
-/// "2026-11-16" + separator + "05:00:00", of the seconds as they stand.
-std::string format(std::chrono::sys_seconds moment, const char* separator) {
-    const auto day = std::chrono::floor<std::chrono::days>(moment);
-    const std::chrono::year_month_day date(day);
-    const std::chrono::hh_mm_ss time(moment - day);
-    std::string text;
-    text.reserve(48);
+void appendDay(std::string& text, sys_days day) {
+    const year_month_day date(day);
     if (const int year = static_cast<int>(date.year()); year >= 0 && year <= 9999) {
         appendTwoDigits(text, static_cast<unsigned>(year) / 100);
         appendTwoDigits(text, static_cast<unsigned>(year) % 100);
@@ -33,6 +33,51 @@ std::string format(std::chrono::sys_seconds moment, const char* separator) {
     appendTwoDigits(text, static_cast<unsigned>(date.month()));
     text += '-';
     appendTwoDigits(text, static_cast<unsigned>(date.day()));
+}
+
+bool hasForm(std::string_view text, std::string_view form) {
+    if (text.size() != form.size())
+        return false;
+    for (std::size_t i = 0; i < form.size(); ++i)
+        if (form[i] == 'd' ? text[i] < '0' || text[i] > '9' : text[i] != form[i])
+            return false;
+    return true;
+}
+
+/// Precondition: there are digits.
+int numberAt(std::string_view text, std::size_t offset, std::size_t width) {
+    int value = 0;
+    for (const char digit : text.substr(offset, width))
+        value = 10 * value + (digit - '0');
+    return value;
+}
+
+/// The zone's distance from UTC, east positive, that a text such as "+0130" names.
+std::optional<minutes> zoneOfText(std::string_view text) {
+    if (!hasForm(text, "+dddd") && !hasForm(text, "-dddd"))
+        return std::nullopt;
+    const int hour = numberAt(text, 1, 2);
+    const int minute = numberAt(text, 3, 2);
+    if (hour > 23 || minute > 59)
+        return std::nullopt;
+    const minutes distance = hours(hour) + minutes(minute);
+    return text.front() == '-' ? -distance : distance;
+}
+
+} // namespace
+
+std::string dayText(sys_days day) {
+    std::string text;
+    appendDay(text, day);
+    return text;
+}
+
+std::string dateAndTimeText(sys_seconds moment, std::string_view separator) {
+    const auto day = floor<days>(moment);
+    const hh_mm_ss time(moment - day);
+    std::string text;
+    text.reserve(48);
+    appendDay(text, day);
     text += separator;
     appendTwoDigits(text, static_cast<unsigned>(time.hours().count()));
     text += ':';
@@ -42,48 +87,52 @@ std::string format(std::chrono::sys_seconds moment, const char* separator) {
     return text;
 }
 
-} // namespace
+std::string isoText(sys_seconds moment) {
+    return dateAndTimeText(moment, "T") + "Z";
+}
+
+std::optional<sys_days> dayOfText(std::string_view text) {
+    if (!hasForm(text, dayForm))
+        return std::nullopt;
+    const year_month_day date{year(numberAt(text, 0, 4)), month(static_cast<unsigned>(numberAt(text, 5, 2))),
+                              day(static_cast<unsigned>(numberAt(text, 8, 2)))};
+    return date.ok() ? std::optional(sys_days(date)) : std::nullopt;
+}
+
+std::optional<sys_seconds> momentOfText(std::string_view text, char separator) {
+    if (text.size() != dayForm.size() + 1 + timeForm.size() || text[dayForm.size()] != separator)
+        return std::nullopt;
+    const std::optional<sys_days> day = dayOfText(text.substr(0, dayForm.size()));
+    const std::string_view time = text.substr(dayForm.size() + 1);
+    if (!day || !hasForm(time, timeForm))
+        return std::nullopt;
+    const int hour = numberAt(time, 0, 2);
+    const int minute = numberAt(time, 3, 2);
+    const int second = numberAt(time, 6, 2);
+    if (hour > 23 || minute > 59 || second > 59)
+        return std::nullopt;
+    return *day + hours(hour) + minutes(minute) + seconds(second);
+}
 
 std::string dateDescription(Time moment) {
-    return format(std::chrono::floor<std::chrono::seconds>(moment), " ") + " +0000";
+    return dateAndTimeText(floor<seconds>(moment), " ") + " +0000";
 }
 
 std::optional<Time> timeOfDateDescription(std::string_view text) {
-    constexpr std::string_view form = "dddd-dd-dd dd:dd:dd sdddd"; // d: a digit, s: a sign
-    if (text.size() != form.size())
+    constexpr std::size_t zoneOffset = dayForm.size() + 1 + timeForm.size();
+    constexpr auto earliest = sys_days{year{1678} / 1 / 1};
+    constexpr auto end = sys_days{year{2262} / 1 / 1};
+    if (text.size() <= zoneOffset || text[zoneOffset] != ' ')
         return std::nullopt;
-    for (std::size_t i = 0; i < form.size(); ++i) {
-        const char c = text[i];
-        const bool fits = form[i] == 'd'   ? c >= '0' && c <= '9'
-                          : form[i] == 's' ? c == '+' || c == '-'
-                                           : c == form[i];
-        if (!fits)
-            return std::nullopt;
-    }
-    const auto number = [text](std::size_t offset, std::size_t width) {
-        int value = 0;
-        for (const char digit : text.substr(offset, width))
-            value = 10 * value + (digit - '0');
-        return value;
-    };
-    const int year = number(0, 4);
-    const std::chrono::year_month_day date{std::chrono::year(year),
-                                           std::chrono::month(static_cast<unsigned>(number(5, 2))),
-                                           std::chrono::day(static_cast<unsigned>(number(8, 2)))};
-    const std::chrono::hours hours(number(11, 2));
-    const std::chrono::minutes minutes(number(14, 2));
-    const std::chrono::seconds seconds(number(17, 2));
-    const std::chrono::hours zoneHours(number(21, 2));
-    const std::chrono::minutes zoneMinutes(number(23, 2));
-    if (year < 1678 || year > 2261 || !date.ok() || hours.count() >= 24 || minutes.count() >= 60 ||
-        seconds.count() >= 60 || zoneHours.count() >= 24 || zoneMinutes.count() >= 60)
+    const std::optional<sys_seconds> moment = momentOfText(text.substr(0, zoneOffset), ' ');
+    const std::optional<minutes> zone = zoneOfText(text.substr(zoneOffset + 1));
+    if (!moment || !zone || *moment < earliest || *moment >= end)
         return std::nullopt;
-    const std::chrono::seconds zone = zoneHours + zoneMinutes;
-    return std::chrono::sys_days(date) + hours + minutes + seconds - (text[20] == '-' ? -zone : zone);
+    return *moment - *zone;
 }
 
-std::string localDateAndTime(const Clock& clock, Time moment, const char* separator) {
-    return format(std::chrono::floor<std::chrono::seconds>(moment) + clock.zoneAt(moment).offset, separator);
+std::string localDateAndTime(const Clock& clock, Time moment, std::string_view separator) {
+    return dateAndTimeText(floor<seconds>(moment) + clock.zoneAt(moment).offset, separator);
 }
 
 } // namespace velmora

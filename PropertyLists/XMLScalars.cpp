@@ -3,30 +3,21 @@
 
 #include "PropertyLists/XMLScalars.h"
 
+#include "Platform/Base64.h"
+#include "Platform/DateText.h"
 #include "PropertyLists/PropertyListDate.h"
 #include "PropertyLists/XMLText.h"
 
-#include <array>
+#include <algorithm>
 #include <charconv>
 #include <cmath>
-#include <cstdio>
 #include <limits>
+#include <utility>
+#include <vector>
 
 namespace velmora {
 
 namespace {
-
-constexpr std::string_view base64Digits = "ABCDEFGHIJKLMNOPQRSTUVWXYZabcdefghijklmnopqrstuvwxyz0123456789+/";
-constexpr std::uint8_t notBase64 = 0xFF;
-
-constexpr std::array<std::uint8_t, 256> base64Values = []() {
-    std::array<std::uint8_t, 256> values{};
-    for (auto& value : values)
-        value = notBase64;
-    for (std::size_t i = 0; i < base64Digits.size(); ++i)
-        values[static_cast<unsigned char>(base64Digits[i])] = static_cast<std::uint8_t>(i);
-    return values;
-}();
 
 std::string_view trimmed(std::string_view text) {
     while (!text.empty() && isXMLSpace(text.front()))
@@ -127,89 +118,30 @@ std::string xmlOfReal(double real) {
 }
 
 std::optional<Date> dateOfXML(std::string_view text) {
-    constexpr std::string_view form = "0000-00-00T00:00:00Z";
-    if (text.size() != form.size())
+    if (!text.ends_with('Z'))
         return std::nullopt;
-    for (std::size_t i = 0; i < form.size(); ++i)
-        if (form[i] == '0' ? !isDigit(text[i]) : text[i] != form[i])
-            return std::nullopt;
-    const auto number = [text](std::size_t offset, std::size_t size) {
-        int result = 0;
-        for (const char digit : text.substr(offset, size))
-            result = 10 * result + (digit - '0');
-        return result;
-    };
-    const std::chrono::year_month_day day(std::chrono::year(number(0, 4)),
-                                          std::chrono::month(static_cast<unsigned>(number(5, 2))),
-                                          std::chrono::day(static_cast<unsigned>(number(8, 2))));
-    const int hours = number(11, 2);
-    const int minutes = number(14, 2);
-    const int seconds = number(17, 2);
-    if (!day.ok() || hours > 23 || minutes > 59 || seconds > 59)
-        return std::nullopt;
-    const Date date = std::chrono::sys_days(day) + std::chrono::hours(hours) + std::chrono::minutes(minutes) +
-                      std::chrono::seconds(seconds);
-    return isPropertyListDate(date) ? std::optional(date) : std::nullopt;
+    const std::optional<Date> date = momentOfText(text.substr(0, text.size() - 1), 'T');
+    return date && isPropertyListDate(*date) ? date : std::nullopt;
 }
 
 std::string xmlOfDate(Date date) {
-    const auto midnight = std::chrono::floor<std::chrono::days>(date);
-    const std::chrono::year_month_day day(midnight);
-    const std::chrono::hh_mm_ss time(date - midnight);
-    char text[64];
-    std::snprintf(text, sizeof text, "%04d-%02u-%02uT%02d:%02d:%02dZ", static_cast<int>(day.year()),
-                  static_cast<unsigned>(day.month()), static_cast<unsigned>(day.day()),
-                  static_cast<int>(time.hours().count()), static_cast<int>(time.minutes().count()),
-                  static_cast<int>(time.seconds().count()));
-    return text;
+    return isoText(date);
 }
 
 std::optional<Data> dataOfXML(std::string_view text) {
-    std::vector<std::uint8_t> bytes;
-    bytes.reserve(text.size() / 4 * 3);
-    std::uint32_t group = 0;
-    std::size_t digits = 0;
-    std::size_t padding = 0;
-    for (const char character : text) {
-        if (isXMLSpace(character))
-            continue;
-        if (character == '=') {
-            ++padding;
-            continue;
-        }
-        const std::uint8_t value = base64Values[static_cast<unsigned char>(character)];
-        if (value == notBase64 || padding > 0)
-            return std::nullopt;
-        group = group << 6 | value;
-        if (++digits % 4 == 0) {
-            bytes.push_back(static_cast<std::uint8_t>(group >> 16 & 0xFF));
-            bytes.push_back(static_cast<std::uint8_t>(group >> 8 & 0xFF));
-            bytes.push_back(static_cast<std::uint8_t>(group & 0xFF));
-        }
-    }
-    const std::size_t rest = digits % 4;
-    if (rest == 1 || padding != (rest == 0 ? 0 : 4 - rest))
-        return std::nullopt;
-    if (rest >= 2)
-        bytes.push_back(static_cast<std::uint8_t>(group >> (rest == 2 ? 4 : 10) & 0xFF));
-    if (rest == 3)
-        bytes.push_back(static_cast<std::uint8_t>(group >> 2 & 0xFF));
-    return Data(std::move(bytes));
+    std::optional<std::vector<std::uint8_t>> bytes = bytesOfBase64(text);
+    return bytes ? std::optional(Data(*std::move(bytes))) : std::nullopt;
 }
 
 void appendXMLOfData(std::string& output, Bytes bytes, std::string_view indent) {
     constexpr std::size_t bytesALine = 57;
     while (!bytes.empty()) {
-        Bytes line = bytes.first(std::min(bytesALine, bytes.size()));
+        const Bytes line = bytes.first(std::min(bytesALine, bytes.size()));
         bytes = bytes.subspan(line.size());
         output += indent;
-        for (; !line.empty(); line = line.subspan(std::min<std::size_t>(3, line.size()))) {
-            std::uint32_t group = 0;
-            for (std::size_t i = 0; i < 3; ++i)
-                group = group << 8 | (i < line.size() ? line[i] : 0U);
-            for (std::size_t i = 0; i < 4; ++i)
-                output += i <= line.size() ? base64Digits[group >> (18 - 6 * i) & 0x3F] : '=';
-        }
+        const std::size_t begin = output.size();
+        output.resize(begin + base64Size(line.size()));
+        putBase64(output.data() + begin, line);
         output += '\n';
     }
 }

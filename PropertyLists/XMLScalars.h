@@ -38,7 +38,7 @@ struct XMLInteger {
 
 /// Base64, white space anywhere, padded to a multiple of four digits.
 [[nodiscard]] std::optional<Data> dataOfXML(std::string_view text);
-/// Appends base64 in lines of 76 digits, each behind `indent` and followed by a line feed.
+/// Appends base64 in lines of 76 digits, each after `indent` and followed by a line feed.
 void appendXMLOfData(std::string& output, Bytes bytes, std::string_view indent);
 
 /// Text with "&lt;" and its like, or "&#38;" and its like, replaced. References that XML itself does not

@@ -5,7 +5,7 @@
 
 # shellcheck disable=SC2034 # those who source it use them
 build_packages=(build-essential cmake ninja-build qt6-base-dev libgl-dev libpugixml-dev libcli11-dev
-    nlohmann-json3-dev)
+    libutf8proc-dev nlohmann-json3-dev)
 # shellcheck disable=SC2034
 test_packages=(libgtest-dev libgmock-dev libbenchmark-dev python3 tshark clang-format fonts-dejavu-core xvfb dbus
     at-spi2-core gir1.2-atspi-2.0 python3-gi desktop-file-utils appstream

@@ -5,11 +5,11 @@
 
 #include "Platform/Linux/ProgramLog.h"
 #include "Platform/SystemLog.h"
-#include "Tools/Convert/ConvertCommand.h"
-#include "Tools/Decode/DecodeCommand.h"
-#include "Tools/Info/InfoCommand.h"
-#include "Tools/Record/RecordCommand.h"
-#include "Tools/Watch/WatchCommand.h"
+#include "Tools/Convert/ConvertOptions.h"
+#include "Tools/Decode/DecodeOptions.h"
+#include "Tools/Info/InfoOptions.h"
+#include "Tools/Record/RecordOptions.h"
+#include "Tools/Watch/WatchOptions.h"
 
 #include <string>
 #include <variant>
@@ -18,9 +18,9 @@ namespace velmora {
 
 /// What the user asked for.
 struct CommandLine {
-    /// The program has nothing to do but say something and end: help, its version, a usage error.
+    /// The program prints a text and ends: help, its version, a usage error.
     struct Words {
-        int status; ///< exit status; a usage error's words go to standard error, others to standard output
+        int status; ///< exit status; a usage error goes to standard error, the others to standard output
         std::string text; ///< whole lines
     };
 
@@ -29,7 +29,7 @@ struct CommandLine {
     std::variant<Words, DecodeOptions, WatchOptions, RecordOptions, ConvertOptions, InfoOptions> command;
 };
 
-/// Reads the arguments, the program's name first. Never ends the program.
+/// Parses the arguments, the program's name first. Never ends the program.
 [[nodiscard]] CommandLine parseCommandLine(int count, const char* const* arguments);
 
 } // namespace velmora

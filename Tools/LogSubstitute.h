@@ -13,8 +13,8 @@
 
 namespace velmora {
 
-/// Stands before the process's system log for as long as it lives, at the log's own level, and puts it back
-/// in the end. The ones below keep log lines from running into what a command shows on the same terminal.
+/// Replaces the process's system log while it lives, at the log's own level; the destructor restores it. The
+/// ones below keep log lines from running into what a command shows on the same terminal.
 class LogSubstitute : public SystemLog {
 public:
     LogSubstitute();
@@ -30,8 +30,8 @@ private:
     SystemLog* _earlier;
 };
 
-/// Keeps the latest lines while the screen is in use, those of the console as well, and passes them on in the
-/// end.
+/// Holds the latest lines, those of the console as well, while the screen is in use, and passes them on
+/// afterwards.
 class HeldLog final : public LogSubstitute {
 public:
     static constexpr std::size_t maximumLines = 200;
@@ -51,8 +51,7 @@ private:
     std::FILE* _earlierConsole;
 };
 
-/// One line on standard error that is written over and over. Log lines that come in between are written in
-/// its place, and it comes back with the next `show`.
+/// One line on standard error that is rewritten in place. A log line replaces it until the next `show`.
 class ProgressLine final : public LogSubstitute {
 public:
     ~ProgressLine() override { clear(); }

@@ -8,17 +8,17 @@
 
 namespace velmora {
 
-/// Where a command's result goes: standard output, in few large writes. Expects SIGPIPE to be ignored. Once
-/// the reader has gone, or writing has failed, what is put here goes nowhere. Main thread only.
+/// Where a command's result goes: standard output, in few large writes. Expects SIGPIPE to be ignored. After
+/// the reader has closed the pipe, or a write has failed, further text is dropped. Main thread only.
 class Output {
 public:
     enum class State {
         Open,
-        Closed, ///< nobody reads any more, which is no error
-        Failed, ///< the system refused a write; the user has been told
+        Closed, ///< the reader has closed the pipe, which is no error
+        Failed, ///< a write failed; the error has been reported
     };
 
-    /// Writes to a descriptor that stays the caller's; `name` is what a message calls it.
+    /// Writes to a descriptor that the caller owns; `name` is what a message calls it.
     explicit Output(int descriptor, std::string name = "standard output");
     /// Writes out what is left.
     ~Output();
@@ -26,12 +26,12 @@ public:
     Output& operator=(const Output&) = delete;
 
     void put(std::string_view text);
-    /// Hands everything so far to the system.
+    /// Writes out everything so far.
     void flush();
 
     [[nodiscard]] State state() const { return _state; }
     [[nodiscard]] bool isOpen() const { return _state == State::Open; }
-    /// Whether the reader has gone, asked of the system without writing.
+    /// Whether the reader has closed the pipe; polls, and writes nothing.
     [[nodiscard]] bool hasLostReader() const;
 
 private:

@@ -10,24 +10,23 @@
 
 namespace velmora {
 
-/// Tells the user on standard error: "velmora-log: " and the text, in one write.
+/// Writes a message to standard error: "velmora-log: " and the text, in one write.
 void report(std::string_view text);
 
 /// How messages call a file: "standard input" for "-".
 [[nodiscard]] std::string fileTitle(const std::string& path);
 
-/// What keeps a command from writing a file that is there.
+/// The message of a command that refuses to overwrite a file.
 [[nodiscard]] std::string alreadyThere(const std::string& path);
 
 /// "TITLE: record N at offset O", or the title alone where there is no record (number 0).
 [[nodiscard]] std::string placeInFile(std::string_view title, std::uint64_t number, std::uint64_t offset);
 
-/// What the program is at work on, for the message that it ends with when a decoder ends it: some failures of
-/// the decoders are meant to end the program and are caught nowhere. The latest one made counts; it must live
-/// on the main thread, which alone uses it.
+/// What the program is working on, for the message that it ends with when a decoder ends it: some failures of
+/// the decoders are meant to end the program and are caught nowhere. The latest one counts. Main thread only.
 class WorkContext {
 public:
-    /// `title`: a file, or the service. `cleanUp` is run before the program ends that way.
+    /// `title`: a file, or the service. `cleanUp` runs before the program ends that way.
     explicit WorkContext(std::string title, std::function<void()> cleanUp = {});
     ~WorkContext();
     WorkContext(const WorkContext&) = delete;
@@ -39,7 +38,7 @@ public:
         _offset = offset;
     }
 
-    /// From now on an exception that nobody catches ends the program with "velmora-log: PLACE: REASON" on
+    /// From now on an uncaught exception ends the program with "velmora-log: PLACE: REASON" on
     /// standard error and exit status 1.
     static void takeOverTermination();
 

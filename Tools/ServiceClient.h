@@ -11,8 +11,8 @@
 
 namespace velmora {
 
-/// What a command that talks to the telephony service stands on: the event loop and the machine's ports,
-/// queue and clock. One a process; outlives the model that is given its platform. Main thread only.
+/// What a command needs to talk to the telephony service: the event loop and the machine's ports, queue and
+/// clock. One per process; must outlive the model that uses its platform. Main thread only.
 class ServiceClient {
 public:
     MainLoop loop;
@@ -21,7 +21,7 @@ public:
     LinuxTelephonyService telephony{ports};
     MachineClock clock;
 
-    /// For a model whose local port has a name of this process's own, so that several watchers and recorders
+    /// For a model whose local port has a name unique to this process, so that several watchers and recorders
     /// and the application can be connected at the same time.
     [[nodiscard]] ModelPlatform platform();
 };

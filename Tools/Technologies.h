@@ -13,12 +13,12 @@
 
 namespace velmora {
 
-/// The telephony service's constant for a technology, named in short or by that constant. Fails with the
-/// names that there are where it is none of them, or is empty.
+/// The telephony service's constant for a technology, given by its short name or by that constant. Fails for
+/// an empty or unknown name, and lists the known ones.
 [[nodiscard]] Result<std::string> technologyNamed(std::string_view name);
 
-/// A decoder for the technology, named in short or by the telephony service's constant. Fails with the names
-/// that there are where it is none of them, or is empty.
+/// A decoder for the technology, given by its short name or by the telephony service's constant. Fails for an
+/// empty or unknown name, and lists the known ones.
 [[nodiscard]] Result<std::unique_ptr<LogGenerator>> makeDecoder(std::string_view technology,
                                                                 const Clock& clock);
 

@@ -6,9 +6,14 @@
 #include "Platform/Console.h"
 #include "Platform/Linux/Files/FileResources.h"
 #include "Tools/CommandLine.h"
+#include "Tools/Convert/ConvertCommand.h"
+#include "Tools/Decode/DecodeCommand.h"
 #include "Tools/ExitStatus.h"
+#include "Tools/Info/InfoCommand.h"
 #include "Tools/Output.h"
+#include "Tools/Record/RecordCommand.h"
 #include "Tools/Report.h"
+#include "Tools/Watch/WatchCommand.h"
 
 #include <csignal>
 #include <cstdio>
@@ -20,12 +25,12 @@ namespace velmora {
 
 namespace {
 
-/// Where a standard stream was closed by whoever started the program, the next file opened would take its
-/// number, and log lines meant for standard error would end up in a recording.
+/// Where a standard stream was closed before the program started, the next file opened would get its number,
+/// and log lines meant for standard error would end up in a recording.
 void keepStandardStreams() {
     int descriptor = 0;
     do
-        descriptor = ::open("/dev/null", O_RDONLY); // to write on it stays an error
+        descriptor = ::open("/dev/null", O_RDONLY); // writing to it stays an error
     while (descriptor >= 0 && descriptor <= STDERR_FILENO);
     if (descriptor >= 0)
         ::close(descriptor);
@@ -47,8 +52,8 @@ int runVelmoraLog(int count, const char* const* arguments) {
     keepStandardStreams();
     // Standard output carries the result alone.
     redirectConsole(stderr);
-    std::signal(SIGPIPE, SIG_IGN); // a closed pipe is told by the write that finds it
-    std::signal(SIGXFSZ, SIG_IGN); // and so is a limit on the file's size
+    std::signal(SIGPIPE, SIG_IGN); // the write that meets a closed pipe reports it
+    std::signal(SIGXFSZ, SIG_IGN); // and so does one that meets a limit on the file's size
     WorkContext::takeOverTermination();
 
     const CommandLine line = parseCommandLine(count, arguments);

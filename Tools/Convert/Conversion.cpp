@@ -43,7 +43,7 @@ Result<Messages> begin(MessageReader& reader, const Conversion& conversion) {
     return Messages{reader, std::move(first), std::string(shortTechnologyName(*technology))};
 }
 
-/// A second descriptor of the file, for a writer that closes what it is given.
+/// A second descriptor of the file, for a writer that closes its descriptor.
 Result<int> ownDescriptor(int descriptor, const std::string& name) {
     const int copy = ::fcntl(descriptor, F_DUPFD_CLOEXEC, 0);
     if (copy < 0)
@@ -102,7 +102,7 @@ Result<bool> toDLFLog(MessageReader& reader, const Conversion& conversion, int d
     return (*writer)->refused() == 0;
 }
 
-/// Waits for what a snapshot saves.
+/// Keeps what a snapshot saves.
 class SaveContents final : public DecodingObserver {
 public:
     /// `refreshes`: how many there will be, where that is known.

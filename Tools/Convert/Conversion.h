@@ -30,7 +30,7 @@ enum class FileForm {
 /// "NAME that ends in" any of these: ".pcapng, .velmora or .dlf".
 inline constexpr const char* formSuffixes = ".pcapng, .velmora or .dlf";
 
-/// What one file becomes of another.
+/// What is converted, and into what.
 struct Conversion {
     FileForm form = FileForm::Recording;
     std::string title;       ///< of the input
@@ -42,11 +42,11 @@ struct Conversion {
     std::optional<std::uint64_t> refreshes;
 };
 
-/// Reads messages to their end and writes them to an open file, which stays the caller's and gets nothing but
-/// this. A recording has all of them with their times; a DLF log has those that it can hold, and the user is
-/// told of the others; a snapshot is the one that the application would have written after the last refresh.
-/// Whether all messages were taken. Fails where there is no such file to be made of them, or it cannot be
-/// written; `context` is kept at the record at hand, exceptions of the decoders pass through.
+/// Reads messages to their end and writes them to an open file, which the caller owns. A recording has all of
+/// them with their times; a DLF log has those that it can hold, and the others are reported; a snapshot is
+/// the one that the application would have written after the last refresh. Returns whether all messages were
+/// written. Fails where such a file cannot be made of them, or cannot be written; `context` gets each
+/// record's number, exceptions of the decoders pass through.
 [[nodiscard]] Result<bool> convertMessages(MessageReader& reader, const Conversion& conversion,
                                            int descriptor, WorkContext& context);
 

@@ -27,7 +27,7 @@ namespace {
 
 constexpr mode_t newFileMode = 0666;
 
-/// The name of what a signal that ends the program leaves behind. A signal handler gets at nothing else.
+/// The name of the file that a signal which ends the program has to remove; a signal handler needs it global.
 char nameToRemove[PATH_MAX];
 
 void removeAndEnd(int number) {
@@ -52,7 +52,7 @@ public:
 private:
     static void handle(void (*handler)(int)) {
         for (const int number : {SIGHUP, SIGINT, SIGTERM})
-            // Whoever started the program with a signal ignored wants it to stay so.
+            // A signal that was ignored when the program started stays ignored.
             if (::signal(number, handler) == SIG_IGN)
                 ::signal(number, SIG_IGN);
     }
@@ -88,7 +88,7 @@ std::optional<std::uint64_t> refreshesOf(const std::string& file) {
 
 /// Whether all of the input is in the output now.
 bool convert(const ConvertOptions& options, MessageReader& reader, const std::string& title) {
-    // Before the draft, so that no moment is left in which memory that cannot be had would leave one behind.
+    // Before the draft, so that an allocation that fails never leaves one on the disk.
     FileDraft* made = nullptr;
     WorkContext context(title, [&made] {
         if (made)

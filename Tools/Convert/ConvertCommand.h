@@ -3,22 +3,11 @@
 
 #pragma once
 
-#include <string>
+#include "Tools/Convert/ConvertOptions.h"
 
 namespace velmora {
 
-/// `velmora-log convert`: a file of log messages in another form. The new file takes its place in one step
-/// when it is whole, so that no failure leaves half of one.
-struct ConvertOptions {
-    std::string file; ///< "-" for standard input
-    /// What it becomes; precondition: it has a form, see `formFromName`.
-    std::string out;
-    bool force = false;      ///< replace a file that is there
-    std::string technology;  ///< before the one that the file names; empty for that one
-    std::string description; ///< a snapshot's
-};
-
-/// The exit status. Trouble with the input does not keep what could be read from being converted.
+/// Returns the exit status. Errors in the input do not keep what could be read from being converted.
 [[nodiscard]] int runConvert(const ConvertOptions& options);
 
 } // namespace velmora

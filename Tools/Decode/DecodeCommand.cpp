@@ -5,9 +5,9 @@
 
 #include "Recording/OpenMessages.h"
 #include "Tools/Decode/CSVRows.h"
-#include "Tools/Decode/DecodeJobs.h"
 #include "Tools/Decode/DecodeProgress.h"
 #include "Tools/Decode/DecodeWriter.h"
+#include "Tools/Decode/Jobs/JobScheduler.h"
 #include "Tools/ExitStatus.h"
 #include "Tools/LogSubstitute.h"
 #include "Tools/Output.h"
@@ -28,13 +28,13 @@ bool writesAsItGoes(const DecodeOptions& options) {
     return options.format == DecodeOptions::Format::JsonLines || options.format == DecodeOptions::Format::Csv;
 }
 
-/// The progress of one file on standard error, where there is anybody to look at it and time to do so.
+/// The progress of one file on standard error, if that is a terminal and the file is long enough.
 class ShownProgress {
 public:
     ShownProgress(const std::string& path, const DecodeOptions& options) {
         if (::isatty(STDERR_FILENO) == 0)
             return;
-        // On one terminal it would stand between the lines.
+        // On the same terminal it would stand between the lines.
         if (writesAsItGoes(options) && ::isatty(STDOUT_FILENO) != 0)
             return;
         const std::optional<std::uint64_t> size = inputSize(path);
@@ -45,7 +45,7 @@ public:
     }
 
     [[nodiscard]] DecodeProgress* get() { return _progress ? &*_progress : nullptr; }
-    /// Takes the line away, before anything else is written there.
+    /// Clears the line, before anything else is written there.
     void clear() {
         if (_line)
             _line->clear();
@@ -99,14 +99,15 @@ bool decodeFile(std::size_t index, const DecodeOptions& options, bool showsProgr
 int runDecode(const DecodeOptions& options, Output& output) {
     if (options.format == DecodeOptions::Format::Csv)
         output.put(CSVRows::header(options));
-    // Standard input has one front: who reads it twice does so in turn.
+    // Standard input that is named twice is read by one process: the second reader gets what is left.
     const std::ptrdiff_t standardInputs = std::count(options.files.begin(), options.files.end(), "-");
     const std::size_t jobs = standardInputs > 1 ? 1 : std::min(options.jobs, options.files.size());
     bool good = true;
     if (jobs > 1) {
-        good = runDecodeJobs(
-            options.files.size(), jobs,
-            [&](std::size_t index, Output& part) { return decodeFile(index, options, false, part); }, output);
+        const Job job = [&](std::size_t index, Output& part) {
+            return decodeFile(index, options, false, part);
+        };
+        good = JobScheduler(options.files.size(), jobs, job, output).run();
     } else {
         for (std::size_t index = 0; index < options.files.size() && output.isOpen(); ++index)
             good = decodeFile(index, options, true, output) && good;

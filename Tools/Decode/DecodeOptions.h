@@ -10,6 +10,10 @@
 #include <string>
 #include <vector>
 
+namespace CLI {
+class App;
+}
+
 namespace velmora {
 
 /// `velmora-log decode`: runs each file through its technology's decoder and shows what the screens show.
@@ -24,11 +28,14 @@ struct DecodeOptions {
 
     Format format = Format::Text;
     Every every = Every::Refresh; ///< `Message` for JsonLines and Csv alone
-    NodeSelection selection;      ///< not empty for Csv; empty where JsonLines tells of messages
+    NodeSelection selection;      ///< not empty for Csv; empty for JsonLines with `Message`
     TimeRange range;
     std::string technology; ///< before the one that the file names; empty for that one
     std::size_t jobs = 1;   ///< how many files are decoded side by side
     std::vector<std::string> files;
 };
+
+/// Adds the command with its options, help and examples. Parsing fills `options`, which must outlive `app`.
+CLI::App* addDecode(CLI::App& app, DecodeOptions& options);
 
 } // namespace velmora

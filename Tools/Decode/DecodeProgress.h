@@ -14,11 +14,11 @@
 
 namespace velmora {
 
-/// How far a long file has been decoded, as a line: "37 %, 85 MiB/s, 12 s left". Looks at the clock no more
-/// than once a MiB, and shows a line no more than five times a second.
+/// How far a long file has been decoded, as a line: "37 %, 85 MiB/s, 12 s left". Reads the clock at most once
+/// a MiB, and shows a line at most five times a second.
 class DecodeProgress {
 public:
-    /// Shorter input is done before anybody asks.
+    /// Shorter input is done too soon for a progress line.
     static constexpr std::uint64_t smallestInput = std::uint64_t{64} << 20;
 
     using Show = std::function<void(std::string_view line)>;
@@ -43,8 +43,7 @@ private:
     std::uint64_t _nextLook;
 };
 
-/// The size of a file that may be opened by that path, "-" being standard input; absent for a pipe and
-/// whatever else has no size that is known.
+/// The size of a regular file, "-" being standard input; absent for pipes, devices and missing files.
 [[nodiscard]] std::optional<std::uint64_t> inputSize(const std::string& path);
 
 } // namespace velmora

@@ -13,18 +13,18 @@ namespace velmora {
 
 class Output;
 
-/// What `decode` prints of a file, in one of its formats: as decoding goes on or in its end.
+/// What `decode` prints of a file, in one of its formats: during decoding or at its end.
 class DecodeWriter : public DecodingObserver {
 public:
-    /// The writer of the options' format. `isLive`: the file may still be growing, as a pipe's other end
-    /// does. `heading` goes before what a text holds. `options` and `output` must outlive it.
+    /// The writer of the options' format. `isLive`: more may still be written to the file, as to a pipe.
+    /// `heading` goes before the text format. `options` and `output` must outlive it.
     [[nodiscard]] static std::unique_ptr<DecodeWriter> make(const DecodeOptions& options,
                                                             const std::string& file, bool isLive,
                                                             std::string heading, Output& output);
 
     /// The file has been decoded to its end.
     virtual void finish(const Decoded&) {}
-    /// Hands over all that is complete, and nothing that is not: decoding may have ended in mid-message.
+    /// Writes out what is complete, and nothing else: decoding may have ended in the middle of a message.
     virtual void flush() {}
     [[nodiscard]] bool hasEnough() const override;
 

@@ -75,9 +75,9 @@ Result<Decoded> decodeMessages(MessageReader& reader, const DecodingRequest& req
     bool more = message.has_value();
     if (more && !observer.hasEnough())
         decode(*message);
-    message.reset(); // gives its part of the reader's buffer back
+    message.reset(); // releases its part of the reader's buffer
     while (more && !observer.hasEnough()) {
-        // Made where it is looked at instead of moved there: there are millions of them.
+        // Constructed in place: a move of each of millions of messages would show.
         const std::optional<LoggedMessage> next = reader.next();
         more = next.has_value();
         if (more)

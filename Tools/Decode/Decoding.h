@@ -19,7 +19,7 @@ namespace velmora {
 class DecodeProgress;
 class WorkContext;
 
-/// What came of decoding a file.
+/// The result of decoding a file.
 struct Decoded {
     std::string technology; ///< the short name
     std::uint64_t messages = 0;
@@ -27,16 +27,15 @@ struct Decoded {
     Value display; ///< as it stands after the latest refresh; none where there was nothing to show
 };
 
-/// Is told of decoding as it goes on. Displays and the state belong to the decoder: they change with the next
-/// message.
+/// Gets decoding's events as they happen. Displays and the state belong to the decoder: they change with the
+/// next message.
 class DecodingObserver {
 public:
     virtual ~DecodingObserver() = default;
 
     /// A wanted message is about to be decoded.
     virtual void messageComes(const LoggedMessage&) {}
-    /// Who is to be told what each message concerned; asked once. Null, without which decoding is faster, for
-    /// nobody.
+    /// What gets the effects of each message; asked once. Null for none, which makes decoding faster.
     [[nodiscard]] virtual MessageEffects* effects() { return nullptr; }
     /// Whether the decoder keeps its history, for what a snapshot saves; asked at the beginning and after each
     /// refresh. Decoding without is faster.
@@ -50,23 +49,23 @@ public:
     virtual void refreshed(Time /*tick*/, const Decoded& /*decoded*/) {}
     /// The last refresh has been; the state is as the decoder leaves it.
     virtual void ended(const LogGenerator& /*decoder*/, const Dictionary& /*state*/) {}
-    /// Whether the rest may be left undone; asked after every message.
+    /// Whether decoding may stop here; asked after every message.
     [[nodiscard]] virtual bool hasEnough() const { return false; }
 };
 
 struct DecodingRequest {
     std::string technology; ///< before the one that the file names; empty for that one
     TimeRange range;        ///< messages outside are passed over, as if the file did not hold them
-    DecodeProgress* progress = nullptr; ///< is kept at the message at hand, wanted or not; may be null
+    DecodeProgress* progress = nullptr; ///< gets the offset of every message, wanted or not; may be null
 };
 
 /// Runs a file's messages through the decoder of its technology, and refreshes as the application does while
-/// they arrive. `context` is kept at the record at hand. Fails, before anything is decoded, when there is no
-/// decoder, and afterwards when that had to do without its template; exceptions of the decoders pass through.
+/// they arrive. `context` gets each record's number. Fails before anything is decoded when there is no
+/// decoder, and afterwards when the decoder had no template; exceptions of the decoders pass through.
 [[nodiscard]] Result<Decoded> decodeMessages(MessageReader& reader, const DecodingRequest& request,
                                              WorkContext& context, DecodingObserver& observer);
 
-/// Tells the user what the reader had to leave out of the file, and how it ended. Whether all of it was read.
+/// Reports what the reader skipped of the file, and why it ended. Returns whether all of it was read.
 bool reportLosses(const MessageReader& reader, const std::string& title);
 
 } // namespace velmora

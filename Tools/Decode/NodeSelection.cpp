@@ -13,18 +13,18 @@ namespace velmora {
 
 namespace {
 
-/// What is left of paths behind the path of a node: "/0" of "/Serving Cell/0" behind "/Serving Cell". The
-/// root has none of its own in front, as paths are joined.
+/// What is left of paths after the path of a node: "/0" of "/Serving Cell/0" after "/Serving Cell". The
+/// root's own path adds nothing in front when paths are joined.
 using Rests = std::vector<std::string_view>;
 
-/// What is left behind a child of that name, empty for the child itself; none where the path does not lead
-/// there. The reverse of appendingPathComponent.
-std::optional<std::string_view> behind(std::string_view rest, bool atRoot, std::string_view name) {
+/// What is left after a child of that name, empty for the child itself; none where the path does not lead to
+/// it. The reverse of appendingPathComponent.
+std::optional<std::string_view> after(std::string_view rest, bool atRoot, std::string_view name) {
     const std::string_view slashes = atRoot && name.empty() ? "//" : "/";
     if (!rest.starts_with(slashes))
         return std::nullopt;
     rest.remove_prefix(slashes.size());
-    // A slash in the name is not told from one between names.
+    // A slash in the name looks like one between names.
     if (!rest.starts_with(name))
         return std::nullopt;
     rest.remove_prefix(name.size());
@@ -35,7 +35,7 @@ std::string_view nameOf(std::string_view key, bool isSorted) {
     return isSorted ? nameOfSortedKey(key) : key;
 }
 
-const Value* findBehind(const Value& value, std::string_view rest, bool atRoot);
+const Value* findAfter(const Value& value, std::string_view rest, bool atRoot);
 
 const Value* findIn(const Dictionary& dictionary, std::string_view rest, bool atRoot) {
     const bool isSorted = dictionary.contains(sortedMarker);
@@ -44,11 +44,11 @@ const Value* findIn(const Dictionary& dictionary, std::string_view rest, bool at
     for (const auto& [key, child] : dictionary) {
         if (key == sortedMarker || child.isNone())
             continue;
-        const std::optional<std::string_view> left = behind(rest, atRoot, nameOf(key, isSorted));
+        const std::optional<std::string_view> left = after(rest, atRoot, nameOf(key, isSorted));
         // The later row: in a sorted dictionary the one of the greater key.
         if (!left || (isSorted && foundKey && key < *foundKey))
             continue;
-        if (const Value* inside = left->empty() ? &child : findBehind(child, *left, false)) {
+        if (const Value* inside = left->empty() ? &child : findAfter(child, *left, false)) {
             found = inside;
             foundKey = &key;
         }
@@ -63,14 +63,14 @@ const Value* findIn(const Array& array, std::string_view rest, bool atRoot) {
     if (error != std::errc() || end != number.data() + number.size() || index >= array.size())
         return nullptr;
     // Only the number as the tree writes it: "0", not "00".
-    const std::optional<std::string_view> left = behind(rest, atRoot, std::to_string(index));
+    const std::optional<std::string_view> left = after(rest, atRoot, std::to_string(index));
     if (!left)
         return nullptr;
-    return left->empty() ? &array[index] : findBehind(array[index], *left, false);
+    return left->empty() ? &array[index] : findAfter(array[index], *left, false);
 }
 
 /// Precondition: `rest` is not empty.
-const Value* findBehind(const Value& value, std::string_view rest, bool atRoot) {
+const Value* findAfter(const Value& value, std::string_view rest, bool atRoot) {
     if (const Dictionary* dictionary = value.asDictionary())
         return findIn(*dictionary, rest, atRoot);
     if (const Array* array = value.asArray())
@@ -87,7 +87,7 @@ struct Share {
 Share shareOf(const Rests& rests, bool atRoot, std::string_view name) {
     Share share;
     for (const std::string_view rest : rests)
-        if (const std::optional<std::string_view> left = behind(rest, atRoot, name)) {
+        if (const std::optional<std::string_view> left = after(rest, atRoot, name)) {
             if (left->empty())
                 share.isSelected = true;
             else
@@ -96,16 +96,16 @@ Share shareOf(const Rests& rests, bool atRoot, std::string_view name) {
     return share;
 }
 
-Value restrictedBehind(const Value& value, const Rests& rests, bool atRoot);
+Value restrictedAfter(const Value& value, const Rests& rests, bool atRoot);
 
 /// What of the child is selected, or none.
 Value selectedPart(const Value& child, const Share& share) {
     if (share.isSelected)
         return child;
-    return share.inside.empty() ? Value() : restrictedBehind(child, share.inside, false);
+    return share.inside.empty() ? Value() : restrictedAfter(child, share.inside, false);
 }
 
-Value restrictedBehind(const Value& value, const Rests& rests, bool atRoot) {
+Value restrictedAfter(const Value& value, const Rests& rests, bool atRoot) {
     if (const Dictionary* dictionary = value.asDictionary()) {
         const bool isSorted = dictionary->contains(sortedMarker);
         const DictionaryRef result = makeDictionary();
@@ -136,7 +136,7 @@ Value restrictedBehind(const Value& value, const Rests& rests, bool atRoot) {
     return {};
 }
 
-NodeRef restrictedBehind(const VelmoraModelNode& node, const Rests& rests, bool atRoot) {
+NodeRef restrictedAfter(const VelmoraModelNode& node, const Rests& rests, bool atRoot) {
     std::vector<NodeRef> children;
     if (const std::vector<NodeRef>* all = node.childNodes())
         for (const NodeRef& child : *all) {
@@ -144,7 +144,7 @@ NodeRef restrictedBehind(const VelmoraModelNode& node, const Rests& rests, bool 
             if (share.isSelected)
                 children.push_back(child);
             else if (NodeRef part =
-                         share.inside.empty() ? nullptr : restrictedBehind(*child, share.inside, false))
+                         share.inside.empty() ? nullptr : restrictedAfter(*child, share.inside, false))
                 children.push_back(std::move(part));
         }
     if (children.empty())
@@ -157,15 +157,15 @@ NodeRef restrictedBehind(const VelmoraModelNode& node, const Rests& rests, bool 
 const Value* NodeSelection::find(const Value& display, std::string_view path) {
     if (display.isNone())
         return nullptr;
-    return path == rootNodePath ? &display : findBehind(display, path, true);
+    return path == rootNodePath ? &display : findAfter(display, path, true);
 }
 
 Value NodeSelection::restricted(const Value& display) const {
-    return selectsAll() ? display : restrictedBehind(display, Rests(_paths.begin(), _paths.end()), true);
+    return selectsAll() ? display : restrictedAfter(display, Rests(_paths.begin(), _paths.end()), true);
 }
 
 NodeRef NodeSelection::restricted(const NodeRef& root) const {
-    return selectsAll() ? root : restrictedBehind(*root, Rests(_paths.begin(), _paths.end()), true);
+    return selectsAll() ? root : restrictedAfter(*root, Rests(_paths.begin(), _paths.end()), true);
 }
 
 bool NodeSelection::selectsAll() const {

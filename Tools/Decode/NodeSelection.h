@@ -14,9 +14,9 @@
 namespace velmora {
 
 /// The parts of a display that a user has selected by the paths of the display tree ("/Serving Cell/ARFCN",
-/// "/Neighboring Cells/0"). Works on the display dictionary itself, where building the tree would cost more
-/// than all else. Where several rows have one path, `find` gives the one that the path leads to, the later;
-/// the restricted displays keep them all.
+/// "/Neighboring Cells/0"). Works on the display dictionary itself, since building the tree would cost more
+/// than all else. Where several rows share a path, `find` returns the last; the restricted displays keep them
+/// all.
 class NodeSelection {
 public:
     /// Precondition: each path is one that `isPath`. Without paths everything is selected.
@@ -31,9 +31,9 @@ public:
     /// The value of the node at the path; null where there is none. Belongs to the display.
     [[nodiscard]] static const Value* find(const Value& display, std::string_view path);
 
-    /// The display with nothing in it but the selected nodes and what leads to them: their keys, "_sorted"
-    /// markers, and, before a selected element of an array, none in the place of each that is not selected.
-    /// None where nothing is selected. Shares the selected nodes with the display.
+    /// The display reduced to the selected nodes and what leads to them: their keys, "_sorted" markers, and,
+    /// before a selected element of an array, none for each element that is not selected. None where nothing
+    /// is selected. Shares the selected nodes with the display.
     [[nodiscard]] Value restricted(const Value& display) const;
     /// The same of a tree; null where nothing is selected.
     [[nodiscard]] NodeRef restricted(const NodeRef& root) const;

@@ -11,9 +11,9 @@
 
 namespace velmora {
 
-/// The process's resources for as long as it lives, which remembers that one could not be had: a decoder
-/// writes that to the log and goes on without its template, as it does on a phone, but what it then shows is
-/// not what the file holds. Main thread only; puts the earlier ones back in the end.
+/// Stands in for the process's resources while it lives, and remembers the first that could not be read. A
+/// decoder logs that and goes on without its template, as it does on a phone, but what it then shows is not
+/// what the file holds. Main thread only; the destructor restores the earlier resources.
 class NotedResources final : public Resources {
 public:
     NotedResources() : _others(setResources(this)) {}
@@ -35,7 +35,7 @@ public:
     }
     [[nodiscard]] std::string buildStamp() const override { return _others->buildStamp(); }
 
-    /// Why the first could not be had; empty where all could.
+    /// Why the first could not be read; empty where all could.
     [[nodiscard]] const std::string& failure() const { return _failure; }
 
 private:

@@ -10,7 +10,7 @@
 
 namespace velmora {
 
-/// The clock of a recording that is being decoded: it shows the time of the message or tick at hand, in UTC.
+/// The clock of a recording that is being decoded: the time of the current message or tick, in UTC.
 class RecordedClock final : public Clock {
 public:
     [[nodiscard]] Time now() const override { return _now; }
@@ -21,15 +21,14 @@ private:
     Time _now{};
 };
 
-/// The refreshes of a recording, at the pace of the application's: ticks lie every 2 s of recorded time from
-/// the first message on, and a tick that has had messages since the last one refreshes. Time stamps may go
-/// back, which makes no tick due, and ahead by any span, which costs no more than a small one.
+/// The refreshes of a recording, at the application's interval: ticks lie every 2 s of recorded time from the
+/// first message on, and a tick with messages since the last one refreshes. Time stamps that go back make no
+/// tick due; a jump ahead costs the same whatever its length.
 class RecordedTicks {
 public:
     static constexpr std::chrono::nanoseconds interval = std::chrono::seconds(2);
 
-    /// Takes in that a message with this time stamp comes next. Gives the tick that refreshes before it, if
-    /// any.
+    /// A message with this time stamp comes next. Returns the tick that refreshes before it, if any.
     [[nodiscard]] std::optional<Time> before(Time message) {
         if (_started && (_exhausted || message < _next))
             return std::nullopt;

@@ -3,6 +3,8 @@
 
 #include "Tools/Decode/TimeRange.h"
 
+#include "Platform/DateText.h"
+
 #include <cstdint>
 #include <string>
 
@@ -27,6 +29,13 @@ public:
             return false;
         _rest.remove_prefix(1);
         return true;
+    }
+
+    /// As many characters as there are, at most `count`.
+    std::string_view take(std::size_t count) {
+        const std::string_view taken = _rest.substr(0, count);
+        _rest.remove_prefix(taken.size());
+        return taken;
     }
 
     /// Exactly `count` digits.
@@ -82,15 +91,8 @@ private:
 };
 
 std::optional<sys_days> readDate(Scanner& text) {
-    const std::optional<unsigned> y = text.digits(4);
-    const std::optional<unsigned> m = y && text.take('-') ? text.digits(2) : std::nullopt;
-    const std::optional<unsigned> d = m && text.take('-') ? text.digits(2) : std::nullopt;
-    if (!d)
-        return std::nullopt;
-    const year_month_day date(year(static_cast<int>(*y)), month(*m), day(*d));
-    if (!date.ok() || sys_days(date) < earliest || sys_days(date) >= latest)
-        return std::nullopt;
-    return sys_days(date);
+    const std::optional<sys_days> date = dayOfText(text.take(std::string_view("2026-11-16").size()));
+    return date && *date >= earliest && *date < latest ? date : std::nullopt;
 }
 
 /// "05:00", "05:00:00" or "05:00:00.25".

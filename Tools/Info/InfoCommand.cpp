@@ -76,7 +76,7 @@ int runInfo(const InfoOptions& options, Output& output) {
     for (; message; message = reader.next())
         summary.add(*message);
 
-    // Only for its sections' names, so that a recording without a decoder is told of all the same.
+    // Only for its sections' names: a recording without a decoder gets its summary as well.
     const RecordedClock clock;
     const Result<std::unique_ptr<LogGenerator>> decoder = makeDecoder(technology, clock);
     const CodeNames names = codeNames(decoder ? decoder->get() : nullptr);

@@ -3,19 +3,13 @@
 
 #pragma once
 
-#include <string>
+#include "Tools/Info/InfoOptions.h"
 
 namespace velmora {
 
 class Output;
 
-/// `velmora-log info`: what a file of log messages holds, and what is wrong with it.
-struct InfoOptions {
-    std::string file;
-    std::string technology; ///< before the one that the file names; empty for that one
-};
-
-/// The exit status.
+/// Returns the exit status.
 [[nodiscard]] int runInfo(const InfoOptions& options, Output& output);
 
 } // namespace velmora

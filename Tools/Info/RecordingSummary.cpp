@@ -26,11 +26,9 @@ void count(RecordingSummary::Count& counted, const LoggedMessage& message) {
 std::string timeText(Time moment) {
     const auto seconds = std::chrono::floor<std::chrono::seconds>(moment);
     const auto milliseconds = std::chrono::floor<std::chrono::milliseconds>(moment - seconds);
-    std::string text = dateDescription(moment);
-    text.erase(text.rfind(' '));
     char fraction[8];
     std::snprintf(fraction, sizeof fraction, ".%03d", static_cast<int>(milliseconds.count()));
-    return text + fraction + " UTC";
+    return dateAndTimeText(seconds, " ") + fraction + " UTC";
 }
 
 std::string durationText(Time first, Time last) {

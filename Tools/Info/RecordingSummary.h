@@ -14,7 +14,7 @@
 
 namespace velmora {
 
-/// What is counted of a recording, message by message.
+/// Counts of a recording, made message by message.
 class RecordingSummary {
 public:
     /// Messages of one kind, and where the first of them stands.
@@ -42,7 +42,7 @@ public:
     [[nodiscard]] const Count& tooShort() const { return _tooShort; }
     /// Of a type byte that is neither stream's, which decoders drop.
     [[nodiscard]] const Count& wrongType() const { return _wrongType; }
-    /// With the two bytes before the record that decoders take away: not malformed.
+    /// With the two bytes before the record that decoders strip: not malformed.
     [[nodiscard]] const Count& prefixed() const { return _prefixed; }
 
 private:
@@ -57,10 +57,10 @@ private:
     Count _prefixed;
 };
 
-/// What the log codes of a technology are to those who decode them.
+/// What the decoder of a technology knows the log codes by.
 struct CodeNames {
     const char* heading = "sections";
-    /// Empty for a code that nobody wants. May be missing, where there is no decoder.
+    /// Returns an empty text for a code that no section wants. Null without a decoder.
     std::function<std::string(std::uint32_t code)> nameOf;
 };
 

@@ -3,23 +3,11 @@
 
 #pragma once
 
-#include <cstdint>
-#include <optional>
-#include <string>
+#include "Tools/Record/RecordOptions.h"
 
 namespace velmora {
 
-class Output;
-
-/// `velmora-log record`: the telephony service's messages, as they arrive, into a recording.
-struct RecordOptions {
-    std::string file;   ///< "-" for standard output
-    bool force = false; ///< overwrite a file that is there
-    std::optional<double> duration_seconds;
-    std::optional<std::uint64_t> count; ///< messages
-};
-
-/// The exit status.
+/// Returns the exit status.
 [[nodiscard]] int runRecord(const RecordOptions& options);
 
 } // namespace velmora

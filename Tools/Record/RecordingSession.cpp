@@ -82,7 +82,7 @@ Result<Done> RecordingSession::learnTechnology(std::string_view technology) {
             return Failure{_path + ": " + made.reason()};
         draft.emplace(*std::move(made));
     }
-    // The writer closes what it is given, and so gets a descriptor of its own.
+    // The writer closes its descriptor, and so gets one of its own.
     const int descriptor = draft ? draft->descriptor() : _file.get();
     const int copy = _path == "-" ? -1 : ::fcntl(descriptor, F_DUPFD_CLOEXEC, 0);
     if (_path != "-" && copy < 0)

@@ -16,9 +16,9 @@
 
 namespace velmora {
 
-/// A recording in the making: the file is there from the beginning, so that trouble with it is told at once;
-/// it gets its head when the technology is known. One that never comes so far leaves no file behind. One that
-/// is overwritten gives way to the new one in one step, head and all. Main thread only.
+/// A recording that is being written. The file is created at once, so that an error shows at once; its head
+/// is written when the technology is known. Without a technology no file is left. A file that is overwritten
+/// is replaced in one step, by one that has its head. Main thread only.
 class RecordingSession {
 public:
     /// Opens the file, "-" being standard output. A regular file that is there already is refused unless
@@ -32,13 +32,13 @@ public:
     /// The service has named the technology. The first time this begins the recording; another one after that
     /// is a failure.
     Result<Done> learnTechnology(std::string_view technology);
-    /// A message has arrived. A failure ends the recording; trouble that may pass is none (see `trouble`).
+    /// A message has arrived. A failure ends the recording; an error that may pass is none (see `trouble`).
     /// Precondition: the technology is known.
     Result<Done> append(Time time, Bytes message);
-    /// Hands what there is to the system, and has it begin to put that on the medium; nothing before the
-    /// technology is known. Tries again where there was trouble. A failure is as above.
+    /// Writes what is buffered to the file, and has the system begin to write it to the medium; nothing
+    /// before the technology is known. Retries after trouble. A failure is as above.
     Result<Done> save();
-    /// Ends the recording. Trouble that is left is a failure now.
+    /// Ends the recording. Trouble that has not passed is a failure now.
     Result<Done> close();
 
     /// The technology's short name; empty while it is unknown.
@@ -57,16 +57,16 @@ public:
     [[nodiscard]] const std::string& trouble() const { return _trouble; }
     /// Whether there is no more room for messages to wait.
     [[nodiscard]] bool isDropping() const { return _writer && _writer->isDropping(); }
-    /// Whether the recording goes to a pipe that nobody reads any more.
+    /// Whether the recording goes to a pipe whose reader has closed it.
     [[nodiscard]] bool hasLostReader() const;
-    /// Takes away the file that this has made, as long as there is nothing in it: for a program that ends
-    /// without a destructor. Asks for no memory.
+    /// Removes the file that this has created, if it is still empty: for a program that ends without
+    /// destructors. Allocates nothing.
     void removeIfEmpty() const;
 
 private:
     explicit RecordingSession(std::string path) : _path(std::move(path)) {}
 
-    /// Keeps trouble that may pass, and lets it pass for success.
+    /// Turns an error that may pass into success, and keeps it as the trouble.
     [[nodiscard]] Result<Done> unlessItMayPass(Result<Done> result);
 
     std::string _path;

@@ -3,6 +3,7 @@
 
 #include "Tools/Text/JSONText.h"
 
+#include "Platform/Base64.h"
 #include "Platform/DateText.h"
 #include "Platform/UTF8.h"
 
@@ -35,8 +36,8 @@ constexpr std::array<bool, 256> plainBytes = []() {
 /// Eight bytes at a time: nearly all of what is written is plain, and in pieces of some ten bytes.
 using Word = std::uint64_t;
 
-/// Whether a byte of the word is not plain. The tests for zero and for less may blame a byte above one that
-/// they blame rightly, which changes nothing.
+/// Whether a byte of the word is not plain. The tests for zero and for less may also flag a byte above one
+/// that they flag rightly, which does not change the result.
 bool hasUnusual(Word word) {
     constexpr Word ones = 0x0101010101010101;
     constexpr Word tops = 0x8080808080808080;
@@ -55,9 +56,9 @@ bool copyPlainWord(char* to, const char* from) {
     return !hasUnusual(word);
 }
 
-/// Copies the text up to the first byte that is not plain, at most. Gives the number of bytes; those behind
-/// may have been written to as well, up to the text's length. All plain bytes up to there are only promised
-/// where the whole text is.
+/// Copies the text, at most up to the first byte that is not plain. Returns the number of bytes; those after
+/// them, up to the text's length, may have been written to as well. It may stop short of that byte, but not
+/// where the whole text is plain.
 std::size_t copyPlain(char* to, std::string_view text) {
     std::size_t done = 0;
     for (; text.size() - done >= sizeof(Word); done += sizeof(Word))
@@ -128,26 +129,11 @@ void appendReal(TextBuffer& out, double real) {
 }
 
 void appendBase64(TextBuffer& out, Bytes bytes) {
-    static constexpr char digits[] = "ABCDEFGHIJKLMNOPQRSTUVWXYZabcdefghijklmnopqrstuvwxyz0123456789+/";
+    const std::size_t size = base64Size(bytes.size());
     out.append('"');
-    for (std::size_t i = 0; i < bytes.size(); i += 3) {
-        const std::size_t present = std::min<std::size_t>(bytes.size() - i, 3);
-        std::uint32_t group = 0;
-        for (std::size_t j = 0; j < 3; ++j)
-            group = group << 8 | (j < present ? bytes[i + j] : 0U);
-        for (std::size_t j = 0; j < 4; ++j)
-            out.append(j <= present ? digits[group >> (18 - 6 * j) & 0x3F] : '=');
-    }
+    putBase64(out.room(size), bytes);
+    out.advance(size);
     out.append('"');
-}
-
-void appendDate(TextBuffer& out, Date date) {
-    // "2026-11-16 05:00:00 +0000" with the standard's separators. The description holds every year's digits.
-    std::string text = dateDescription(date);
-    text.resize(text.rfind(' '));
-    text += 'Z';
-    text[text.find(' ')] = 'T';
-    appendJsonString(out, text);
 }
 
 void appendScalar(TextBuffer& out, const Value& value) {
@@ -155,7 +141,7 @@ void appendScalar(TextBuffer& out, const Value& value) {
     case ValueKind::Integer: appendNumber(out, *value.asInteger()); break;
     case ValueKind::Real: appendReal(out, *value.asReal()); break;
     case ValueKind::Boolean: out.append(*value.asBoolean() ? "true" : "false"); break;
-    case ValueKind::Date: appendDate(out, *value.asDate()); break;
+    case ValueKind::Date: appendJsonString(out, isoText(*value.asDate())); break;
     case ValueKind::Data: appendBase64(out, value.asData()->bytes()); break;
     default: out.append("null"); break;
     }

@@ -12,9 +12,9 @@
 
 namespace velmora {
 
-/// A writer of one line a refresh or message. Lines are collected and handed over in large pieces, and where
-/// `isLive`, since somebody may wait for them, at each refresh as well. One that has been begun and not ended
-/// is never handed over.
+/// A writer of one line per refresh or message. Lines are written out in large pieces, and with `isLive`,
+/// since a reader may be waiting for them, at each refresh as well. A line that has not been ended is never
+/// written out.
 class LineWriter : public DecodeWriter {
 public:
     void refreshed(Time tick, const Decoded& decoded) override;
@@ -24,7 +24,7 @@ public:
 protected:
     LineWriter(Output& output, bool isLive) : DecodeWriter(output), _isLive(isLive) {}
 
-    /// Where the line at hand is appended.
+    /// The current line is appended here.
     [[nodiscard]] TextBuffer& line() { return _lines; }
     void appendTime(Time moment) { _time.append(_lines, moment); }
     void endLine(std::string_view end);

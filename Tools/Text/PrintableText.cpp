@@ -5,56 +5,17 @@
 
 #include "Platform/UTF8.h"
 
-#include <algorithm>
-#include <array>
 #include <cstdio>
-#include <iterator>
 #include <optional>
+
+#include <utf8proc.h>
 
 namespace velmora {
 
 namespace {
 
-struct Range {
-    char32_t first;
-    char32_t last;
-};
-
-// The blocks that matter on a screen of names and numbers, not all of Unicode: marks that sit on the
-// character before them, and characters as wide as two.
-constexpr std::array<Range, 11> zeroWidth = {{{0x0300, 0x036F},
-                                              {0x0483, 0x0489},
-                                              {0x0591, 0x05BD},
-                                              {0x064B, 0x065F},
-                                              {0x1AB0, 0x1AFF},
-                                              {0x1DC0, 0x1DFF},
-                                              {0x200B, 0x200F},
-                                              {0x20D0, 0x20FF},
-                                              {0xFE00, 0xFE0F},
-                                              {0xFE20, 0xFE2F},
-                                              {0xFEFF, 0xFEFF}}};
-constexpr std::array<Range, 10> doubleWidth = {{{0x1100, 0x115F},
-                                                {0x2E80, 0x303E},
-                                                {0x3041, 0x33FF},
-                                                {0x3400, 0x4DBF},
-                                                {0x4E00, 0x9FFF},
-                                                {0xAC00, 0xD7A3},
-                                                {0xF900, 0xFAFF},
-                                                {0xFF00, 0xFF60},
-                                                {0x1F300, 0x1FAFF},
-                                                {0x20000, 0x3FFFD}}};
-
-template <std::size_t size>
-bool isIn(const std::array<Range, size>& ranges, char32_t character) {
-    return std::any_of(ranges.begin(), ranges.end(), [character](const Range& range) {
-        return character >= range.first && character <= range.last;
-    });
-}
-
 std::size_t widthOf(char32_t character) {
-    if (isIn(zeroWidth, character))
-        return 0;
-    return isIn(doubleWidth, character) ? 2 : 1;
+    return static_cast<std::size_t>(utf8proc_charwidth(static_cast<utf8proc_int32_t>(character)));
 }
 
 bool isControl(char32_t character) {

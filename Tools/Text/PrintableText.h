@@ -9,13 +9,13 @@
 
 namespace velmora {
 
-/// Text that a terminal shows as it stands: what comes out of a recording must not be able to steer it. Line
+/// Text that a terminal shows as it stands: what a recording holds must not be able to control it. Line
 /// feeds, tabs and carriage returns become "\n", "\t", "\r", other control characters "\xNN" or "\u{NN}", and
 /// a byte that is no UTF-8 becomes U+FFFD. Text without any of these is unchanged.
 [[nodiscard]] std::string printable(std::string_view text);
 
-/// The terminal columns that printable text takes: none for combining marks, two for East Asian wide
-/// characters and emoji, otherwise one a character.
+/// The terminal columns that printable text takes, as Unicode has them: none for combining marks, two for
+/// East Asian wide characters and emoji, otherwise one a character.
 [[nodiscard]] std::size_t displayWidth(std::string_view text);
 
 /// As much of the front of printable text as fits into `columns`; what had to be cut ends in "…".

@@ -12,8 +12,8 @@
 
 namespace velmora {
 
-/// Text that is appended to and then used again: the storage grows and stays, so that a writer of many lines
-/// allocates nothing once it has written the longest.
+/// Text whose storage is reused: it grows and is kept, so that a writer of many lines allocates nothing once
+/// it has written the longest.
 class TextBuffer {
 public:
     [[nodiscard]] std::string_view view() const { return {_characters.get(), _size}; }
@@ -31,7 +31,7 @@ public:
         _size += text.size();
     }
 
-    /// Where the next `count` characters may be written; they belong to the text once `advance` says so.
+    /// Room for the next `count` characters; `advance` makes them part of the text.
     [[nodiscard]] char* room(std::size_t count) {
         if (_capacity - _size < count || !_characters)
             grow(count);

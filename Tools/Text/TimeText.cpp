@@ -3,6 +3,8 @@
 
 #include "Tools/Text/TimeText.h"
 
+#include "Platform/DateText.h"
+
 #include <cstdint>
 #include <cstring>
 
@@ -23,13 +25,7 @@ void TimeText::append(TextBuffer& out, Time moment) {
     const auto day = floor<days>(moment);
     if (day != _day) {
         _day = day;
-        // The years of a Time are 1677 to 2262: four digits.
-        const year_month_day date(day);
-        putDigits(_date, 4, static_cast<std::uint64_t>(static_cast<int>(date.year())));
-        _date[4] = '-';
-        putDigits(_date + 5, 2, static_cast<unsigned>(date.month()));
-        _date[7] = '-';
-        putDigits(_date + 8, 2, static_cast<unsigned>(date.day()));
+        dayText(day).copy(_date, sizeof _date); // the years of a Time are 1677 to 2262: four digits
     }
     // In unsigned numbers, since the first day that a Time reaches begins before it.
     const auto sinceMidnight = static_cast<std::uint64_t>(moment.time_since_epoch().count()) -

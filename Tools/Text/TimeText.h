@@ -12,7 +12,7 @@
 namespace velmora {
 
 /// Writes moments as "2026-11-16T05:00:00.000000000Z" (RFC 3339, UTC, always nine digits of fraction, so that
-/// they sort as text). Remembers the day, whose calendar date is what costs.
+/// they sort as text). Caches the day's text: the calendar is the expensive part.
 class TimeText {
 public:
     static constexpr std::size_t length = 30;

@@ -18,7 +18,7 @@ struct TreeRow {
 };
 
 /// The rows of a tree in its order: what stands below the root, at column 0, two blanks further in a level. A
-/// leaf shows its name and its value; the values of one parent begin in one column, two blanks behind the
+/// leaf shows its name and its value; the values of one parent begin in one column, two blanks after the
 /// longest name. The root itself, whose name is the application's, has no row; a root that is a leaf has none
 /// at all, as on the screens.
 [[nodiscard]] std::vector<TreeRow> treeRows(const VelmoraModelNode& root);

@@ -57,8 +57,8 @@ Terminal::Terminal(Events events) : _events(std::move(events)) {
     if (::isatty(STDIN_FILENO) != 0 && ::tcgetattr(STDIN_FILENO, &_earlier) == 0) {
         _hasKeys = true;
         termios keys = _earlier;
-        // Ctrl-C stays a signal. The keys that stop or kill a program without asking it do nothing, since the
-        // screen could not be put back.
+        // Ctrl-C stays a signal. The keys that suspend or abort a program do nothing, since the screen could
+        // not be restored.
         keys.c_lflag &= ~static_cast<tcflag_t>(ICANON | ECHO | IEXTEN);
         keys.c_iflag &= ~static_cast<tcflag_t>(IXON);
         keys.c_cc[VSUSP] = _POSIX_VDISABLE;

@@ -16,7 +16,7 @@
 namespace velmora {
 
 /// The terminal on standard output while a program draws on all of it: the alternate screen without a cursor,
-/// keys from standard input as they are pressed. Everything is put back by `restore` or the destructor. One a
+/// keys from standard input as they are pressed. `restore` or the destructor puts everything back. One per
 /// process, on the main thread's event loop.
 class Terminal {
 public:

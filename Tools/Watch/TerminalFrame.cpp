@@ -20,9 +20,6 @@ constexpr const char* plain = "\x1b[0m";
 /// Columns grow in such steps, so that a value which gains a digit does not move the whole screen.
 constexpr std::size_t widthStep = 8;
 
-/// The longest sequence that a key sends, and more.
-constexpr std::size_t longestSequence = 16;
-
 std::string statusLine(std::string_view status, const ScreenLayout& layout, std::size_t scroll,
                        std::size_t columns) {
     std::string right;
@@ -75,55 +72,13 @@ std::string composeFrame(const std::vector<TreeRow>& rows, std::string_view stat
             column = start + displayWidth(text);
             frame += rows[index].isBranch ? bold + text + plain : text;
         }
-        // After a full line the cursor still stands on its last character, which clearing would take away.
+        // After a full line the cursor is still on its last character, which clearing would erase.
         if (column < size.columns)
             frame += clearToEndOfLine;
         frame += "\r\n";
     }
     frame += statusLine(status, layout, first, size.columns);
     return frame;
-}
-
-std::vector<Key> KeyReader::take(std::string_view bytes) {
-    struct Sequence {
-        std::string_view bytes;
-        Key key;
-    };
-    static constexpr Sequence sequences[] = {
-        {"k", Key::Up},         {"\x1b[A", Key::Up},   {"\x1bOA", Key::Up},      {"j", Key::Down},
-        {"\x1b[B", Key::Down},  {"\x1bOB", Key::Down}, {"\x1b[5~", Key::PageUp}, {"\x1b[6~", Key::PageDown},
-        {" ", Key::PageDown},   {"\x1b[H", Key::Home}, {"\x1bOH", Key::Home},    {"\x1b[1~", Key::Home},
-        {"\x1b[7~", Key::Home}, {"\x1b[F", Key::End},  {"\x1bOF", Key::End},     {"\x1b[4~", Key::End},
-        {"\x1b[8~", Key::End},  {"q", Key::Quit},      {"\x03", Key::Quit},
-    };
-    std::vector<Key> keys;
-    _pending += bytes;
-    while (!_pending.empty()) {
-        const auto whole =
-            std::find_if(std::begin(sequences), std::end(sequences),
-                         [this](const Sequence& sequence) { return _pending.starts_with(sequence.bytes); });
-        if (whole != std::end(sequences)) {
-            keys.push_back(whole->key);
-            _pending.erase(0, whole->bytes.size());
-            continue;
-        }
-        const bool begun =
-            std::any_of(std::begin(sequences), std::end(sequences),
-                        [this](const Sequence& sequence) { return sequence.bytes.starts_with(_pending); });
-        if (begun)
-            break;
-        // A key that means nothing here: its sequence goes as a whole, so that its last letter is no key.
-        std::size_t length = 1;
-        if (_pending[0] == '\x1b' && _pending.size() > 1 && (_pending[1] == '[' || _pending[1] == 'O')) {
-            const std::size_t end =
-                _pending.find_first_of("ABCDEFGHIJKLMNOPQRSTUVWXYZabcdefghijklmnopqrstuvwxyz~", 2);
-            if (end == std::string::npos && _pending.size() < longestSequence)
-                break;
-            length = end == std::string::npos ? _pending.size() : end + 1;
-        }
-        _pending.erase(0, length);
-    }
-    return keys;
 }
 
 std::size_t scrolledBy(Key key, std::size_t scroll, const ScreenLayout& layout) {

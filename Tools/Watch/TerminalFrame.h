@@ -4,6 +4,7 @@
 #pragma once
 
 #include "Tools/Text/TreeText.h"
+#include "Tools/Watch/KeyReader.h"
 
 #include <cstddef>
 #include <string>
@@ -12,7 +13,7 @@
 
 namespace velmora {
 
-/// What a terminal shows of the display tree, as plain functions: no terminal is needed to say what is on it.
+/// What a terminal shows of the display tree, as plain functions that need no terminal.
 
 struct ScreenSize {
     std::size_t columns = 80;
@@ -42,19 +43,6 @@ inline constexpr std::size_t columnGap = 3;
 /// is the first row shown; one past the layout's maximum counts as the maximum.
 [[nodiscard]] std::string composeFrame(const std::vector<TreeRow>& rows, std::string_view status,
                                        ScreenSize size, std::size_t scroll);
-
-/// A key that means something to the screen.
-enum class Key { Up, Down, PageUp, PageDown, Home, End, Quit };
-
-/// Tells keys from the bytes that a terminal sends for them. Sequences may come in pieces; what means nothing
-/// is passed over.
-class KeyReader {
-public:
-    [[nodiscard]] std::vector<Key> take(std::string_view bytes);
-
-private:
-    std::string _pending; ///< the beginning of a sequence
-};
 
 /// Where the screen is scrolled to after a key. `Quit` scrolls nowhere.
 [[nodiscard]] std::size_t scrolledBy(Key key, std::size_t scroll, const ScreenLayout& layout);

@@ -25,12 +25,12 @@ namespace {
 
 using namespace std::chrono_literals;
 
-/// How often the connection and the pipe are looked at between refreshes.
+/// How often the connection and the pipe are checked between refreshes.
 constexpr auto statusInterval = 250ms;
 constexpr const char* connecting = "Connecting...";
 
-/// A model that tells when it meets another technology than the one before. A model's display is that of the
-/// technology it met first, and stays so; what another one reports takes another model.
+/// A model that reports a change of the technology. A model's display is that of the first technology and
+/// stays so; another technology takes another model.
 class WatchModel final : public VelmoraModel {
 public:
     WatchModel(ModelPlatform platform, ModelObserver* observer, std::function<void()> technologyChanged)
@@ -50,7 +50,7 @@ private:
     std::string _technology;
 };
 
-/// The model's observer: hands each refresh to the view, and keeps the status line true in between.
+/// The model's observer: passes each refresh to the view, and keeps the status line up to date in between.
 class Watcher final : public ModelObserver {
 public:
     Watcher(const WatchOptions& options, Output& output, ServiceClient& client)
@@ -69,9 +69,9 @@ public:
         });
         const SignalWatcher signals([this](int) { _client.loop.quit(ExitStatus::Done); });
         _client.queue.async([this] { _model->restartMonitor(); });
-        // The first look comes after the first attempt to connect.
-        _client.queue.async([this] { lookAround(); });
-        _statusTimer = _client.queue.repeating(statusInterval, [this] { lookAround(); });
+        // The first check comes after the first attempt to connect.
+        _client.queue.async([this] { checkStatus(); });
+        _statusTimer = _client.queue.repeating(statusInterval, [this] { checkStatus(); });
         const int status = _client.loop.run();
         _statusTimer.reset();
         _model->destroyPorts();
@@ -102,12 +102,12 @@ private:
 
     [[nodiscard]] std::string status() const { return _model->isConnected() ? _updateMessage : connecting; }
 
-    void lookAround() {
+    void checkStatus() {
         if (!_view->isOpen()) {
             _client.loop.quit(ExitStatus::Done);
             return;
         }
-        // Connected again, but without news: the line stays until there are some.
+        // Connected again, but without a refresh so far: the line stays until there is one.
         if (_once || _model->isConnected() || _shownStatus == connecting)
             return;
         _shownStatus = connecting;

@@ -15,7 +15,7 @@
 
 namespace velmora {
 
-/// Where `watch` shows what it sees. Main thread only.
+/// Where `watch` shows the display tree. Main thread only.
 class WatchView {
 public:
     virtual ~WatchView() = default;
@@ -23,9 +23,9 @@ public:
     virtual void showRefresh(const std::string& status, std::vector<TreeRow> rows) = 0;
     /// The connection is lost, or there again; the rows are as they were.
     virtual void showStatus(const std::string& status) = 0;
-    /// Whether there is anybody left to show it to.
+    /// Whether there is still a reader or a terminal.
     [[nodiscard]] virtual bool isOpen() const = 0;
-    /// Gives the terminal back, if one is in use.
+    /// Restores the terminal, if one is in use.
     virtual void leave() {}
 };
 
@@ -42,8 +42,8 @@ private:
     bool _begun = false;
 };
 
-/// Keeps the terminal showing the latest refresh. Log lines wait until the screen is left where they would
-/// run into it.
+/// Shows the latest refresh on the terminal. Log lines that would run into the screen are held until it is
+/// restored.
 class ScreenView final : public WatchView {
 public:
     /// `quit` is called when the user wants to end, or the terminal is gone.
@@ -58,7 +58,8 @@ private:
     void draw();
 
     std::function<void()> _quit;
-    std::unique_ptr<HeldLog> _heldLog; ///< declared before the terminal: it speaks once the screen is left
+    std::unique_ptr<HeldLog>
+        _heldLog; ///< declared before the terminal: its lines come after the screen is restored
     Terminal _terminal;
     KeyReader _keys;
     std::string _status;

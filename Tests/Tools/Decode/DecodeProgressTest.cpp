@@ -5,6 +5,7 @@
 
 #include "Tests/Support/FakeClock.h"
 #include "Tests/Support/TemporaryDirectory.h"
+#include "Tests/Tools/ToolFixture.h"
 
 #include <gmock/gmock.h>
 
@@ -16,6 +17,7 @@ namespace velmora {
 namespace {
 
 using testing::ElementsAre;
+using testing::HasSubstr;
 using namespace std::chrono_literals;
 
 constexpr std::uint64_t mebibyte = std::uint64_t{1} << 20;
@@ -59,6 +61,35 @@ TEST(DecodeProgressTest, OnlyFilesHaveASize) {
     EXPECT_EQ(inputSize((directory / "gone").string()), std::nullopt);
     EXPECT_EQ(inputSize("/dev/null"), std::nullopt);
     EXPECT_EQ(inputSize("/"), std::nullopt);
+}
+
+class DecodeProgressProgramTest : public ToolTest {
+protected:
+    /// So many MiB of messages that no section wants.
+    void writeLargeRecording(const std::string& name, std::size_t mebibytes) const {
+        const Data message(std::vector<std::uint8_t>(std::size_t{1} << 20, 0x01));
+        writeRecording(name, "Ostrel_GSM", std::vector<TimedMessage>(mebibytes, {at(0), message}));
+    }
+};
+
+TEST_F(DecodeProgressProgramTest, ProgressOfLongInputShowsOnATerminalAlone) {
+    writeLargeRecording("long.pcapng", 65);
+    writeLargeRecording("short.pcapng", 63);
+    constexpr const char* shown = "0 %";
+    constexpr const char* cleared = "\r\x1b[K";
+    const auto errorsOf = [this](const std::string& file, bool onTerminal) {
+        ToolProcess::Setup setup = tool({"decode", "--format", "csv", "--select", "/", path(file)});
+        setup.errorsOnTerminal = onTerminal;
+        ToolProcess process(setup);
+        EXPECT_EQ(process.exitStatus(), 0);
+        return process.errors();
+    };
+    const std::string errors = errorsOf("long.pcapng", true);
+    EXPECT_THAT(errors, HasSubstr(shown));
+    const std::size_t last = errors.rfind(" %");
+    EXPECT_NE(errors.find(cleared, last), std::string::npos) << errors;
+    EXPECT_EQ(errorsOf("long.pcapng", false).find(shown), std::string::npos);
+    EXPECT_EQ(errorsOf("short.pcapng", true).find(shown), std::string::npos);
 }
 
 } // namespace

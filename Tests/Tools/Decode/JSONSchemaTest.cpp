@@ -44,7 +44,7 @@ protected:
     /// How many objects the text holds; the checker's complaint where one is wrong.
     static std::string check(const std::string& text) {
         ToolProcess::Setup setup;
-        setup.arguments = {VELMORA_SOURCE_DIR "/Tests/Tools/check-json.py",
+        setup.arguments = {VELMORA_SOURCE_DIR "/Tests/Tools/Decode/check-json.py",
                            VELMORA_SOURCE_DIR "/Resources/velmora-log.schema.json"};
         setup.input = text;
         setup.environment = {{"LD_PRELOAD", ""}};

@@ -48,6 +48,7 @@ TEST(JSONTextTest, EveryKindHasItsForm) {
         {true, "true"},
         {false, "false"},
         {Date(sys_days{year{2026} / November / 16} + hours{5} + seconds{9}), "\"2026-11-16T05:00:09Z\""},
+        {Date(sys_days{year{9999} / December / 31}), "\"9999-12-31T00:00:00Z\""}, // no Time reaches it
         {hex(""), "\"\""},
         {hex("4D"), "\"TQ==\""},
         {hex("4D 61"), "\"TWE=\""},

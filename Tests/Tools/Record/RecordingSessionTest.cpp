@@ -3,7 +3,7 @@
 
 #include "Tools/Record/RecordingSession.h"
 
-#include "Tests/Tools/RecordFixture.h"
+#include "Tests/Tools/Record/RecordFixture.h"
 
 #include <gmock/gmock.h>
 

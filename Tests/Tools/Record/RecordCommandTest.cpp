@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Tests/Tools/RecordFixture.h"
+#include "Tests/Tools/Record/RecordFixture.h"
 
 #include <gmock/gmock.h>
 

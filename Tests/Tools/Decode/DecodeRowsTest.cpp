@@ -1,0 +1,47 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
+#include "Tests/Tools/Decode/DecodeLinesFixture.h"
+
+#include <string>
+
+// What `decode` prints row by row, as CSV.
+
+namespace velmora {
+namespace {
+
+class DecodeRowsTest : public DecodeLinesTest {};
+
+TEST_F(DecodeRowsTest, CsvHasARowForEachRefreshAndACellForEachPath) {
+    writeDrive("a.pcapng");
+    EXPECT_EQ(decode({"--format", "csv", "--select", "/GSM RR Info/RR State", "--select",
+                      "/No, such/\"path\"", path("a.pcapng"), "--select", "/UMTS RR Info"}),
+              "time,/GSM RR Info/RR State,\"/No, such/\"\"path\"\"\",/UMTS RR Info\r\n"
+              "2026-11-16T05:00:02.000000000Z,RR_PLMN_LIST_CONSTRUCTION,,{}\r\n"
+              "2026-11-16T05:00:04.000000000Z,RR_IDLE,,{}\r\n");
+}
+
+TEST_F(DecodeRowsTest, CsvOfSeveralFilesHasAColumnForThem) {
+    writeDrive("a.pcapng");
+    writeDrive("b,c.pcapng");
+    EXPECT_EQ(decode({"--format", "csv", "--select", "/GSM RR Info/RR State", "--to", "+2", path("a.pcapng"),
+                      path("b,c.pcapng")}),
+              "time,file,/GSM RR Info/RR State\r\n"
+              "2026-11-16T05:00:02.000000000Z," +
+                  path("a.pcapng") +
+                  ",RR_PLMN_LIST_CONSTRUCTION\r\n"
+                  "2026-11-16T05:00:02.000000000Z,\"" +
+                  path("b,c.pcapng") + "\",RR_PLMN_LIST_CONSTRUCTION\r\n");
+}
+
+TEST_F(DecodeRowsTest, CsvMayHaveARowForEachMessage) {
+    writeDrive("a.pcapng");
+    EXPECT_EQ(decode({"--format", "csv", "--every", "message", "--select", "/GSM RR Info/RR State", "--from",
+                      "2026-11-16T05:00:01.5Z", path("a.pcapng")}),
+              "time,/GSM RR Info/RR State\r\n"
+              "2026-11-16T05:00:01.500000000Z,\r\n" // the message that set it lies outside
+              "2026-11-16T05:00:02.000000000Z,RR_IDLE\r\n");
+}
+
+} // namespace
+} // namespace velmora

@@ -1,0 +1,91 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
+#include "Tests/Tools/Decode/DecodeLinesFixture.h"
+
+#include <gmock/gmock.h>
+
+#include <algorithm>
+
+// `decode --jobs`: several files side by side.
+
+namespace velmora {
+namespace {
+
+using testing::StartsWith;
+
+class DecodeJobsTest : public DecodeLinesTest {};
+
+TEST_F(DecodeJobsTest, JobsPrintWhatOneAfterTheOtherPrints) {
+    writeDrive("a.pcapng");
+    writeRecording("empty.pcapng", "Ostrel_GSM", {});
+    // More than a pipe holds, at both ends of the row.
+    writeRecording("long.pcapng", "Ostrel_GSM", std::vector<TimedMessage>(20'000, {at(0), rrState(5)}));
+    const std::vector<std::string> files = {path("long.pcapng"),  path("a.pcapng"), path("gone.pcapng"),
+                                            path("empty.pcapng"), path("a.pcapng"), path("long.pcapng")};
+    for (const std::vector<std::string>& format :
+         {std::vector<std::string>{"--format", "jsonl", "--every", "message"},
+          {"--format", "json"},
+          {"--format", "csv", "--every", "message", "--select", "/GSM RR Info/RR State"},
+          {}}) {
+        std::vector<std::string> arguments = {"decode", "--log-level", "0"};
+        arguments.insert(arguments.end(), format.begin(), format.end());
+        arguments.insert(arguments.end(), files.begin(), files.end());
+        ToolProcess serial(tool(arguments));
+        EXPECT_EQ(serial.exitStatus(), 1);
+        for (const char* jobs : {"2", "5", "100"}) {
+            arguments.emplace_back("--jobs");
+            arguments.emplace_back(jobs);
+            ToolProcess side(tool(arguments));
+            arguments.resize(arguments.size() - 2);
+            EXPECT_EQ(side.exitStatus(), 1);
+            EXPECT_TRUE(side.output() == serial.output()) << jobs << " jobs";
+            EXPECT_EQ(ownWords(side.errors()),
+                      "velmora-log: " + path("gone.pcapng") + ": cannot open: No such file or directory\n");
+        }
+        EXPECT_EQ(ownWords(serial.errors()),
+                  "velmora-log: " + path("gone.pcapng") + ": cannot open: No such file or directory\n");
+    }
+}
+
+TEST_F(DecodeJobsTest, JobsGoWithoutADirectoryForTemporaryFiles) {
+    writeRecording("long.pcapng", "Ostrel_GSM", std::vector<TimedMessage>(5'000, {at(0), rrState(5)}));
+    ToolProcess::Setup setup = tool({"decode", "--format", "jsonl", "--every", "message", path("long.pcapng"),
+                                     path("long.pcapng"), path("long.pcapng")});
+    ToolProcess serial(setup);
+    EXPECT_EQ(serial.exitStatus(), 0);
+    setup.arguments.insert(setup.arguments.end(), {"--jobs", "3"});
+    setup.environment["TMPDIR"] = path("no such directory");
+    ToolProcess side(setup);
+    EXPECT_EQ(side.exitStatus(), 0);
+    EXPECT_TRUE(side.output() == serial.output());
+}
+
+TEST_F(DecodeJobsTest, JobThatADecoderEndsEndsThoseAfterIt) {
+    writeDrive("a.pcapng");
+    const std::vector<std::uint64_t> offsets =
+        writeRecording("sim.pcapng", "Ostrel_GSM", {{at(0), record(0x0000, "DE AD BE EF", 0xFF)}});
+    ToolProcess process(tool({"decode", "--jobs", "3", "--log-level", "0", "--format", "csv", "--select", "/",
+                              path("a.pcapng"), path("sim.pcapng"), path("a.pcapng")}));
+    EXPECT_EQ(process.exitStatus(), 1);
+    EXPECT_THAT(process.output(), StartsWith("time,file,/\r\n2026-11-16T05:00:02.000000000Z," +
+                                             path("a.pcapng") + ",\"{\"\"GSM RR Info"));
+    EXPECT_EQ(std::count(process.output().begin(), process.output().end(), '\r'), 3);
+    EXPECT_EQ(ownWords(process.errors()), "velmora-log: " + path("sim.pcapng") + ": record 1 at offset " +
+                                              std::to_string(offsets[0]) +
+                                              ": SIM File dictionary data could not be constructed\n");
+}
+
+TEST_F(DecodeJobsTest, StandardInputTwiceIsReadInTurn) {
+    writeDrive("a.pcapng");
+    ToolProcess::Setup setup = tool({"decode", "--format", "jsonl", "--jobs", "2", "-", "-"});
+    setup.input = contentOf("a.pcapng");
+    ToolProcess process(setup);
+    EXPECT_EQ(process.exitStatus(), 1);
+    EXPECT_EQ(process.output(),
+              std::string("{\"file\":\"-\",") + firstRefresh + "\n{\"file\":\"-\"," + secondRefresh + "\n");
+    EXPECT_THAT(ownWords(process.errors()), StartsWith("velmora-log: standard input: empty"));
+}
+
+} // namespace
+} // namespace velmora

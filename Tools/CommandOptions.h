@@ -1,0 +1,26 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include <CLI/CLI.hpp>
+
+#include <functional>
+#include <string>
+#include <vector>
+
+namespace velmora {
+
+/// What the options of several commands have in common. Checks fail with what the option got and what it
+/// wanted.
+
+/// `wanted` describes the texts for which `isGood` holds.
+[[nodiscard]] CLI::Validator wants(std::function<bool(const std::string&)> isGood, const std::string& wanted);
+[[nodiscard]] CLI::Validator wantsOneOf(const std::vector<std::string>& words);
+/// A whole number above 0.
+[[nodiscard]] CLI::Validator wantsCount();
+
+/// `--technology`, with a description that begins with `purpose`.
+void addTechnology(CLI::App& command, std::string& technology, const std::string& purpose);
+
+} // namespace velmora

@@ -1,0 +1,113 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
+#include "Tools/Decode/DecodeOptions.h"
+
+#include "Tools/CommandOptions.h"
+
+#include <optional>
+
+namespace velmora {
+
+namespace {
+
+void addBound(CLI::App& command, const std::string& name, std::optional<TimeBound>& bound,
+              const std::string& description) {
+    command
+        .add_option_function<std::string>(
+            name,
+            [&bound](const std::string& text) {
+                if (const Result<TimeBound> read = readTimeBound(text))
+                    bound = *read;
+            },
+            description)
+        ->check(CLI::Validator(
+            [](const std::string& text) {
+                const Result<TimeBound> read = readTimeBound(text);
+                return read ? std::string() : read.reason();
+            },
+            ""))
+        ->type_name("TIME");
+}
+
+/// Refuses options that make no sense together.
+void checkTogether(const DecodeOptions& options) {
+    using Format = DecodeOptions::Format;
+    const bool hasSelection = !options.selection.paths().empty();
+    const bool everyMessage = options.every == DecodeOptions::Every::Message;
+    if (options.format == Format::Csv && !hasSelection)
+        throw CLI::ValidationError("--format csv", "got no --select, wanted one for each column");
+    if (everyMessage && options.format != Format::JsonLines && options.format != Format::Csv)
+        throw CLI::ValidationError("--every message", "got another format, wanted --format jsonl or csv");
+    if (everyMessage && options.format == Format::JsonLines && hasSelection)
+        throw CLI::ValidationError(
+            "--every message", "got --select with --format jsonl, wanted it with --format csv or not at all");
+}
+
+} // namespace
+
+CLI::App* addDecode(CLI::App& app, DecodeOptions& options) {
+    CLI::App* command = app.add_subcommand("decode", "Show what recordings hold, as the screens would");
+    command->add_option("FILE", options.files, "Recordings; - is standard input")->required()->type_name("");
+    command
+        ->add_option_function<std::string>(
+            "--format",
+            [&options](const std::string& name) {
+                using Format = DecodeOptions::Format;
+                options.format = name == "json"    ? Format::Json
+                                 : name == "jsonl" ? Format::JsonLines
+                                 : name == "csv"   ? Format::Csv
+                                                   : Format::Text;
+            },
+            "text, unless told otherwise: the display tree in the end; json: an object in the end, with the "
+            "technology, the number of messages, and the display; jsonl: such an object with its time on a "
+            "line of its own for each refresh; csv: a row for each refresh, a column for each --select")
+        ->check(wantsOneOf({"text", "json", "jsonl", "csv"}))
+        ->type_name("text|json|jsonl|csv");
+    command
+        ->add_option_function<std::string>(
+            "--every",
+            [&options](const std::string& what) {
+                using Every = DecodeOptions::Every;
+                options.every = what == "message" ? Every::Message : Every::Refresh;
+            },
+            "message: jsonl has an object for each message, with its code and what it concerned, and csv a "
+            "row; refresh, unless told otherwise")
+        ->check(wantsOneOf({"refresh", "message"}))
+        ->type_name("refresh|message");
+    command
+        ->add_option_function<std::vector<std::string>>(
+            "--select",
+            [&options](const std::vector<std::string>& paths) { options.selection = NodeSelection(paths); },
+            "Only this part of the display, by the names on the screens: \"/GSM/GSM Serving Cell/RSSI\", "
+            "\"/GSM/Neighboring Cells/0\"; may be given several times")
+        ->check(wants(NodeSelection::isPath, "a path that begins with a slash"))
+        ->expected(1)
+        ->allow_extra_args(false) // a FILE may follow
+        ->multi_option_policy(CLI::MultiOptionPolicy::TakeAll)
+        ->type_name("PATH");
+    addBound(*command, "--from", options.range.from, "Only messages of this time and later");
+    addBound(*command, "--to", options.range.to, "Only messages before this time");
+    addTechnology(*command, options.technology, "Decode as");
+    command->add_option("--jobs", options.jobs, "Decode this many files side by side")
+        ->check(wantsCount())
+        ->type_name("N");
+    command->footer(
+        "With several files, text is headed by the files' names, json is one object a file, one behind\n"
+        "the other, and jsonl and csv say in each line which \"file\" it is of. All JSON is laid out as\n"
+        "velmora-log.schema.json says. A cell of csv without a value is empty.\n\n"
+        "A TIME is ISO 8601 (UTC unless it has a zone), seconds since 1970, or +SECONDS after the file's\n"
+        "first message.\n\n"
+        "Examples:\n"
+        "  velmora-log decode drive.pcapng\n"
+        "  velmora-log decode --format json drive.pcapng | jq .display\n"
+        "  velmora-log decode --format jsonl --every message --from +60 --to +120 drive.pcapng\n"
+        "  velmora-log decode --format csv --select '/GSM/GSM Serving Cell/RSSI' drive.pcapng > rssi.csv\n"
+        "  velmora-log decode --from 2026-11-16T05:00:00Z --select /GSM drive.pcapng\n"
+        "  velmora-log decode --format jsonl --jobs 4 monday/*.pcapng > monday.jsonl\n"
+        "  velmora-log decode --technology Ostrel_GSM - < drive.pcapng");
+    command->callback([&options] { checkTogether(options); });
+    return command;
+}
+
+} // namespace velmora

@@ -1,0 +1,76 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
+#include "Tools/Decode/Jobs/JobScheduler.h"
+
+#include "Tools/ExitStatus.h"
+#include "Tools/Report.h"
+
+#include <utility>
+
+#include <poll.h>
+#include <unistd.h>
+
+namespace velmora {
+
+namespace {
+
+constexpr std::size_t pieceSize = std::size_t{256} << 10;
+
+} // namespace
+
+JobScheduler::JobScheduler(std::size_t count, std::size_t atATime, Job job, Output& output)
+    : _count(count), _atATime(atATime), _job(std::move(job)), _output(output),
+      _errors(STDERR_FILENO, "standard error"), _buffer(pieceSize) {
+    output.flush(); // else the new processes would have a copy of it
+}
+
+bool JobScheduler::run() {
+    const JobOutlets outlets{_output, _errors};
+    bool good = true;
+    for (std::size_t done = 0; done < _count; ++done) {
+        startMore();
+        JobProcess& first = *_processes.front();
+        if (!first.becomeFirst(outlets, _buffer)) {
+            report("what a job has written cannot be read back");
+            return false;
+        }
+        while (!first.hasEnded() && _output.isOpen()) {
+            serve();
+            startMore();
+        }
+        if (!_output.isOpen())
+            break;
+        const int status = first.exitStatus();
+        if (status != ExitStatus::Done && status != JobProcess::badButOver)
+            return false;
+        good = good && status == ExitStatus::Done;
+        _processes.pop_front();
+    }
+    return good;
+}
+
+void JobScheduler::startMore() {
+    // Those that have ended and are not first in line yet do not count.
+    std::size_t running = 0;
+    for (const auto& process : _processes)
+        running += process->hasEnded() ? 0 : 1;
+    for (; running < _atATime && _started < _count; ++running)
+        _processes.push_back(std::make_unique<JobProcess>(_started++, _job));
+}
+
+/// Waits until a process has written something, or has ended, and reads that.
+void JobScheduler::serve() {
+    const JobOutlets outlets{_output, _errors};
+    std::vector<pollfd> watched;
+    for (const auto& process : _processes)
+        process->watch(watched, process == _processes.front());
+    if (::poll(watched.data(), watched.size(), -1) < 0)
+        return;
+    for (const pollfd& each : watched)
+        if (each.revents != 0)
+            for (const auto& process : _processes)
+                process->read(each.fd, process == _processes.front() ? &outlets : nullptr, _buffer);
+}
+
+} // namespace velmora

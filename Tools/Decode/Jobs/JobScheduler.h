@@ -1,0 +1,43 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include "Tools/Decode/Jobs/JobProcess.h"
+#include "Tools/Output.h"
+
+#include <cstddef>
+#include <deque>
+#include <memory>
+#include <vector>
+
+namespace velmora {
+
+/// Does a number of jobs side by side, each in a process of its own, since the decoders are not made for
+/// several threads. Output and standard error are as if the jobs had been done one after the other: what a
+/// later one writes is kept until it is first in line. A job that ends its process ends those after it, whose
+/// output is dropped. No other thread may run meanwhile.
+class JobScheduler {
+public:
+    /// Jobs 0 to `count`-1, up to `atATime` of them running. `output` must outlive this; what it still holds
+    /// is written here.
+    JobScheduler(std::size_t count, std::size_t atATime, Job job, Output& output);
+
+    /// Whether all jobs went well.
+    [[nodiscard]] bool run();
+
+private:
+    void startMore();
+    void serve();
+
+    std::size_t _count;
+    std::size_t _atATime;
+    Job _job;
+    Output& _output;
+    Output _errors;
+    std::vector<char> _buffer;
+    std::size_t _started = 0;
+    std::deque<std::unique_ptr<JobProcess>> _processes; ///< in the order of the output
+};
+
+} // namespace velmora

@@ -1,0 +1,27 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include <cstdint>
+#include <optional>
+#include <string>
+
+namespace CLI {
+class App;
+}
+
+namespace velmora {
+
+/// `velmora-log record`: the telephony service's messages, as they arrive, into a recording.
+struct RecordOptions {
+    std::string file;   ///< "-" for standard output
+    bool force = false; ///< overwrite a file that is there
+    std::optional<double> duration_seconds;
+    std::optional<std::uint64_t> count; ///< messages
+};
+
+/// Adds the command with its options, help and examples. Parsing fills `options`, which must outlive `app`.
+CLI::App* addRecord(CLI::App& app, RecordOptions& options);
+
+} // namespace velmora

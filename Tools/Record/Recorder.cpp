@@ -1,0 +1,145 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
+#include "Tools/Record/Recorder.h"
+
+#include "Platform/Linux/SignalWatcher.h"
+#include "Platform/TelephonyService.h"
+#include "Tools/ExitStatus.h"
+#include "Tools/Report.h"
+#include "Tools/Technologies.h"
+
+#include <chrono>
+#include <cmath>
+#include <cstdint>
+#include <string>
+#include <utility>
+
+namespace velmora {
+
+namespace {
+
+using namespace std::chrono_literals;
+
+/// How long a message may wait before it is in the file, which leaves the medium the rest of a second.
+constexpr auto saveInterval = 500ms;
+/// How often writing is retried while the file cannot be written, and the progress is shown.
+constexpr auto progressInterval = 1s;
+
+} // namespace
+
+Recorder::Recorder(const RecordOptions& options, RecordingSession& session, ServiceClient& client)
+    : _options(options), _session(session), _client(client),
+      _news(session, options.file, client.clock.now()) {
+    RecordingModel::Events events;
+    events.message = [this](const Data& message) { take(message); };
+    events.technology = [this](std::string_view technology, bool hasDecoder) {
+        return learn(technology, hasDecoder);
+    };
+    _model = std::make_shared<RecordingModel>(client.platform(), std::move(events));
+}
+
+int Recorder::run() {
+    const WorkContext context(serviceTitle, [this] {
+        _session.removeIfEmpty();
+        _model->destroyPorts();
+    });
+    const SignalWatcher signals([this](int) { end(ExitStatus::Done); });
+    _client.queue.async([model = _model] { model->restartMonitor(); });
+    if (_options.duration_seconds)
+        _client.queue.after(std::chrono::nanoseconds(
+                                static_cast<std::int64_t>(std::llround(*_options.duration_seconds * 1e9))),
+                            [this] { end(ExitStatus::Done); });
+    const std::unique_ptr<Timer> saving = _client.queue.repeating(saveInterval, [this] { save(); });
+    const std::unique_ptr<Timer> retrying = _client.queue.repeating(progressInterval, [this] { retry(); });
+    showProgress();
+    const int status = _client.loop.run();
+    _model->destroyPorts();
+    _news.endProgress();
+    return status;
+}
+
+/// The service has named the technology. Whether its messages are wanted: without a decoder there is no
+/// command that would make the service send anything.
+bool Recorder::learn(std::string_view technology, bool hasDecoder) {
+    if (_ended)
+        return false;
+    if (!hasDecoder)
+        return check(Failure{"the telephony service speaks " + std::string(shortTechnologyName(technology)) +
+                             ", which has no decoder here, wanted one of " + technologyNames()});
+    // It may have gone and come back between two checks.
+    if (std::exchange(_streaming, false))
+        serviceIsGone();
+    if (!check(_session.learnTechnology(technology)))
+        return false;
+    if (std::exchange(_gone, false))
+        _news.tell(std::string(serviceTitle) + " is back");
+    _streaming = true;
+    return true;
+}
+
+void Recorder::take(const Data& message) {
+    if (_ended)
+        return;
+    if (check(_session.append(_client.clock.now(), message.bytes())) && _options.count &&
+        _session.messages() >= *_options.count)
+        end(ExitStatus::Done);
+}
+
+void Recorder::save() {
+    if (_ended)
+        return;
+    checkService();
+    if (_session.hasLostReader())
+        end(ExitStatus::Done);
+    else if (_session.trouble().empty())
+        static_cast<void>(check(_session.save()));
+}
+
+void Recorder::retry() {
+    if (!_ended && !_session.trouble().empty())
+        static_cast<void>(check(_session.save()));
+    if (!_ended)
+        showProgress();
+}
+
+void Recorder::checkService() {
+    // The model checks by itself, but at the pace of its redraws.
+    _model->refresh();
+    if (_streaming && !_model->isConnected()) {
+        _streaming = false;
+        serviceIsGone();
+    }
+}
+
+void Recorder::serviceIsGone() {
+    _gone = true;
+    _news.tell(std::string(serviceTitle) + " is gone; waiting for it");
+}
+
+/// Ends the recording on a failure, after reporting it. Returns whether there was none.
+bool Recorder::check(const Result<Done>& result) {
+    if (result) {
+        _news.tellTrouble();
+        return true;
+    }
+    if (_session.hasLostReader()) {
+        end(ExitStatus::Done);
+        return false;
+    }
+    _news.tell(result.reason());
+    end(ExitStatus::BadInput);
+    return false;
+}
+
+void Recorder::showProgress() {
+    _news.showProgress(_client.clock.now(), _model->isConnected());
+}
+
+void Recorder::end(int status) {
+    if (std::exchange(_ended, true))
+        return;
+    _client.loop.quit(status);
+}
+
+} // namespace velmora

@@ -1,0 +1,48 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include "Tools/Record/RecordOptions.h"
+#include "Tools/Record/RecordingModel.h"
+#include "Tools/Record/RecordingNews.h"
+#include "Tools/Record/RecordingSession.h"
+#include "Tools/ServiceClient.h"
+
+#include <memory>
+#include <string_view>
+
+namespace velmora {
+
+/// Records what the telephony service sends until the user, a signal, a limit or a failure ends it. Main
+/// thread only.
+class Recorder {
+public:
+    /// All three must outlive this.
+    Recorder(const RecordOptions& options, RecordingSession& session, ServiceClient& client);
+
+    /// Runs the client's event loop. Returns the exit status.
+    int run();
+
+private:
+    bool learn(std::string_view technology, bool hasDecoder);
+    void take(const Data& message);
+    void save();
+    void retry();
+    void checkService();
+    void serviceIsGone();
+    bool check(const Result<Done>& result);
+    void showProgress();
+    void end(int status);
+
+    const RecordOptions& _options;
+    RecordingSession& _session;
+    ServiceClient& _client;
+    RecordingNews _news;
+    std::shared_ptr<RecordingModel> _model;
+    bool _streaming = false; ///< the service has been told to send
+    bool _gone = false;      ///< the service is gone, and the user has been told
+    bool _ended = false;
+};
+
+} // namespace velmora

@@ -1,0 +1,67 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
+#include "Tools/Record/RecordingNews.h"
+
+#include "Tools/Report.h"
+#include "Tools/ServiceClient.h"
+
+#include <chrono>
+#include <utility>
+
+#include <unistd.h>
+
+namespace velmora {
+
+namespace {
+
+std::string queueSize() {
+    return std::to_string(RecordingWriter::maximumQueue >> 20) + " MiB";
+}
+
+} // namespace
+
+RecordingNews::RecordingNews(const RecordingSession& session, std::string file, Time started)
+    : _session(session), _file(std::move(file)), _started(started) {
+    if (::isatty(STDERR_FILENO) != 0)
+        _progress = std::make_unique<ProgressLine>();
+}
+
+void RecordingNews::tell(const std::string& text) {
+    if (_progress)
+        _progress->clear();
+    report(text);
+    logLine(LogPriority::Error, text);
+}
+
+void RecordingNews::tellTrouble() {
+    const bool trouble = !_session.trouble().empty();
+    if (trouble && !_toldTrouble)
+        tell(_session.trouble() + "; recording goes on when it can be, until then up to " + queueSize() +
+             " of messages wait");
+    if (_session.isDropping() && !_toldDropping)
+        tell(queueSize() + " of messages wait for " + _file + "; further ones are dropped");
+    if (!trouble && _toldTrouble) {
+        const std::uint64_t dropped = _session.dropped() - _droppedBefore;
+        tell(_file + " can be written again; " + (dropped == 0 ? "no" : std::to_string(dropped)) +
+             " messages were dropped");
+        _droppedBefore = _session.dropped();
+    }
+    _toldTrouble = trouble;
+    _toldDropping = _session.isDropping();
+}
+
+void RecordingNews::showProgress(Time now, bool isConnected) {
+    if (!_progress)
+        return;
+    const auto elapsed = std::chrono::floor<std::chrono::seconds>(now - _started);
+    std::string text = std::to_string(_session.messages()) + " messages, " +
+                       std::to_string(_session.bytes()) + " bytes, " + std::to_string(elapsed.count()) + " s";
+    if (!isConnected)
+        text += std::string("; waiting for ") + serviceTitle;
+    if (!_session.trouble().empty())
+        text += "; " + std::to_string(_session.unsaved().messages) + " wait to be written";
+    _progress->show(text);
+}
+
+} // namespace velmora

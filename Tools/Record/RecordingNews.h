@@ -1,0 +1,41 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include "Tools/LogSubstitute.h"
+#include "Tools/Record/RecordingSession.h"
+
+#include <cstdint>
+#include <memory>
+#include <string>
+
+namespace velmora {
+
+/// What the user is told while a recording is made: messages on standard error and in the log, and a line of
+/// progress where standard error is a terminal. Main thread only.
+class RecordingNews {
+public:
+    /// `session` must outlive this; `file` is what messages call the recording.
+    RecordingNews(const RecordingSession& session, std::string file, Time started);
+
+    /// A message that the user must get even without looking at the terminal: it goes to the log as well.
+    void tell(const std::string& text);
+    /// Tells each change once: trouble that has come up, messages for which there is no room, trouble that
+    /// has passed.
+    void tellTrouble();
+
+    void showProgress(Time now, bool isConnected);
+    void endProgress() { _progress.reset(); }
+
+private:
+    const RecordingSession& _session;
+    std::string _file;
+    Time _started;
+    std::unique_ptr<ProgressLine> _progress;
+    bool _toldTrouble = false;
+    bool _toldDropping = false;
+    std::uint64_t _droppedBefore = 0; ///< in all earlier trouble
+};
+
+} // namespace velmora

@@ -1,0 +1,20 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+namespace CLI {
+class App;
+}
+
+namespace velmora {
+
+/// `velmora-log watch`: the display tree of what the telephony service reports, kept up to date.
+struct WatchOptions {
+    bool once = false; ///< print the first refresh and end
+};
+
+/// Adds the command with its options, help and examples. Parsing fills `options`, which must outlive `app`.
+CLI::App* addWatch(CLI::App& app, WatchOptions& options);
+
+} // namespace velmora
