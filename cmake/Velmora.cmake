@@ -2,8 +2,8 @@
 
 add_library(velmora_options INTERFACE)
 target_include_directories(velmora_options INTERFACE ${PROJECT_SOURCE_DIR})
-target_compile_options(velmora_options INTERFACE -Wall -Wextra -Wpedantic -Wshadow -Wconversion -Werror
-                       -fstack-protector-strong)
+target_compile_options(velmora_options INTERFACE -Wall -Wextra -Wpedantic -Wshadow -Wconversion
+                       $<$<BOOL:${VELMORA_WERROR}>:-Werror> -fstack-protector-strong)
 target_link_options(velmora_options INTERFACE -Wl,-z,relro,-z,now)
 if(VELMORA_SANITIZE)
     target_compile_options(velmora_options INTERFACE -fsanitize=address,undefined -fno-sanitize-recover=all
