@@ -1,5 +1,7 @@
 # What every target of the project is built with, and the helpers that declare them.
 
+include(cmake/Hardening.cmake)
+
 add_library(velmora_options INTERFACE)
 target_include_directories(velmora_options INTERFACE ${PROJECT_SOURCE_DIR})
 target_compile_options(velmora_options INTERFACE -Wall -Wextra -Wpedantic -Wshadow -Wconversion
@@ -25,12 +27,7 @@ elseif(VELMORA_COVERAGE)
                            "-fprofile-exclude-files=^(/usr|${PROJECT_SOURCE_DIR}/(Tests|Fuzz))/")
     target_link_options(velmora_options INTERFACE --coverage)
 elseif(CMAKE_BUILD_TYPE MATCHES "Rel")
-    target_compile_options(velmora_options INTERFACE -U_FORTIFY_SOURCE -D_FORTIFY_SOURCE=2 -fstack-clash-protection)
-    if(CMAKE_SYSTEM_PROCESSOR MATCHES "x86_64|i.86")
-        target_compile_options(velmora_options INTERFACE -fcf-protection)
-    elseif(CMAKE_SYSTEM_PROCESSOR MATCHES "aarch64")
-        target_compile_options(velmora_options INTERFACE -mbranch-protection=standard)
-    endif()
+    velmora_harden(velmora_options)
     # The programs hold no paths of the build, which would make two builds of one source differ. The build tree comes
     # last, since it may lie in the source tree and the last option that matches applies.
     target_compile_options(velmora_options INTERFACE -ffile-prefix-map=${PROJECT_SOURCE_DIR}=.
