@@ -33,10 +33,10 @@ show_progress() {
     [ -z "$shown" ] || printf '\r\033[K' >&2
 }
 
-# Ninja's "[120/760] Building ...".
+# Ninja's "[120/760] Building ...", but not its "[0/2] Re-running CMake...", which comes before the steps are known.
 # shellcheck disable=SC2034,SC2317 # show_progress calls it and reads what it sets
 parse_build_line() {
-    if [[ $1 =~ ^\[([0-9]+)/([0-9]+)\]\  ]]; then
+    if [[ $1 =~ ^\[([0-9]+)/([0-9]+)\]\ (.*) && ${BASH_REMATCH[3]} != Re-* ]]; then
         progress="Building: ${BASH_REMATCH[1]} of ${BASH_REMATCH[2]} steps"
     fi
 }
