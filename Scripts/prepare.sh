@@ -3,17 +3,21 @@
 # shellcheck shell=bash
 # What ./run and ./test share: installing what is missing, configuring, building. Sourced, not run.
 
-# shellcheck disable=SC2034 # those who source it use them
+. Scripts/progress.sh
+
+# shellcheck disable=SC2034 # the scripts that source this file use them
 build_packages=(build-essential cmake ninja-build qt6-base-dev libgl-dev libpugixml-dev libcli11-dev
-    libutf8proc-dev nlohmann-json3-dev)
+    libutf8proc-dev)
 # shellcheck disable=SC2034
-test_packages=(libgtest-dev libgmock-dev libbenchmark-dev python3 tshark clang-format fonts-dejavu-core xvfb dbus
-    at-spi2-core gir1.2-atspi-2.0 python3-gi desktop-file-utils appstream
-    modemmanager shellcheck lintian fakeroot file systemd python3-jsonschema mandoc bash-completion)
+test_packages=(libgtest-dev libgmock-dev libbenchmark-dev nlohmann-json3-dev python3 tshark clang-format-14
+    fonts-dejavu-core xvfb dbus at-spi2-core gir1.2-atspi-2.0 python3-gi desktop-file-utils appstream
+    modemmanager shellcheck reuse git lintian fakeroot file systemd python3-jsonschema mandoc bash-completion)
 # shellcheck disable=SC2034
 fuzz_packages=(clang libclang-rt-14-dev)
 # shellcheck disable=SC2034
-lint_packages=(clang-tidy cppcheck)
+cppcheck_packages=(cppcheck git)
+# shellcheck disable=SC2034
+lint_packages=(clang-tidy)
 
 say() { printf '%s\n' "$*" >&2; }
 
@@ -38,13 +42,21 @@ install_missing() {
         fi
         as_root=(sudo)
     fi
-    say "Installing ${missing[*]}"
-    "${as_root[@]}" apt-get update -qq >&2 &&
-        "${as_root[@]}" env DEBIAN_FRONTEND=noninteractive apt-get install -y -qq --no-install-recommends \
-            "${missing[@]}" >&2 && return 0
+    say "Installing ${#missing[@]} packages: ${missing[*]}"
+    mkdir -p build
+    run_apt update && run_apt install -y --no-install-recommends "${missing[@]}" && return 0
     say "Installing failed. As root, run:"
     say "  apt-get install --no-install-recommends ${missing[*]}"
     return 1
+}
+
+# run_apt ARGUMENT...: apt-get, with its progress shown; its messages are printed only if it fails.
+run_apt() {
+    "${as_root[@]}" env DEBIAN_FRONTEND=noninteractive apt-get -q -o APT::Status-Fd=1 -o Dpkg::Use-Pty=0 "$@" \
+        </dev/null 2>&1 | show_progress build/apt.log parse_apt_line || {
+        grep -vE '^(dl|pm)status:' build/apt.log >&2
+        return 1
+    }
 }
 
 # configure PRESET DIRECTORY OPTION...: configures unless that has been done; the options apply then only.
@@ -52,8 +64,36 @@ configure() {
     local preset=$1 directory=$2
     shift 2
     [ -f "$directory/build.ninja" ] && [ $# -eq 0 ] && return 0
-    cmake --preset "$preset" "$@" >"$directory.log" 2>&1 || {
-        cat "$directory.log" >&2
+    say "Configuring $directory"
+    mkdir -p "$directory"
+    cmake --preset "$preset" "$@" >"$directory/configure.log" 2>&1 || {
+        cat "$directory/configure.log" >&2
         return 1
     }
+}
+
+# has_options DIRECTORY OPTION...: whether the tree is configured with all of these turned on.
+has_options() {
+    local cache=$1/CMakeCache.txt option
+    shift
+    for option in "$@"; do
+        grep -qs "^$option:BOOL=ON" "$cache" || return 1
+    done
+}
+
+# build DIRECTORY [TARGET...]: builds the targets, or everything. On a terminal Ninja shows how far it is.
+build() {
+    local directory=$1 command=(cmake --build "$1") result=0
+    shift
+    [ $# -eq 0 ] || command+=(--target "$@")
+    local -x NINJA_STATUS='[%f/%t] '
+    trap 'exit 130' INT # Ninja ends with a status of its own then, as if something had not compiled
+    if on_terminal; then
+        "${command[@]}" >&2 || result=1
+    elif ! "${command[@]}" 2>&1 | show_progress "$directory/build.log" parse_build_line; then
+        grep -vE '^\[[0-9]+/[0-9]+\] ' "$directory/build.log" >&2 || true
+        result=1
+    fi
+    trap - INT
+    return "$result"
 }

@@ -2,12 +2,17 @@
 # SPDX-License-Identifier: MIT
 # What every target of the project is built with, and the helpers that declare them.
 
+include(cmake/Hardening.cmake)
+
 add_library(velmora_options INTERFACE)
 target_include_directories(velmora_options INTERFACE ${PROJECT_SOURCE_DIR})
-target_compile_options(velmora_options INTERFACE -Wall -Wextra -Wpedantic -Wshadow -Wconversion -Werror
-                       -fstack-protector-strong)
+target_compile_options(velmora_options INTERFACE -Wall -Wextra -Wpedantic -Wshadow -Wconversion
+                       $<$<BOOL:${VELMORA_WERROR}>:-Werror> -fstack-protector-strong)
 target_link_options(velmora_options INTERFACE -Wl,-z,relro,-z,now)
-if(VELMORA_SANITIZE)
+if(VELMORA_SANITIZE STREQUAL thread)
+    target_compile_options(velmora_options INTERFACE -fsanitize=thread)
+    target_link_options(velmora_options INTERFACE -fsanitize=thread)
+elseif(VELMORA_SANITIZE)
     target_compile_options(velmora_options INTERFACE -fsanitize=address,undefined -fno-sanitize-recover=all
                            -fno-omit-frame-pointer)
     target_link_options(velmora_options INTERFACE -fsanitize=address,undefined)
@@ -19,22 +24,17 @@ elseif(VELMORA_FUZZ)
     target_link_options(velmora_options INTERFACE -fsanitize=address,undefined)
 elseif(VELMORA_COVERAGE)
     # The tests are compiled so too, since the linker may take a header's function from them, but only what is
-    # tested is counted. Atomically: some of the tests write on threads of their own.
+    # tested is counted. Atomically, since some tests start threads.
     target_compile_options(velmora_options INTERFACE --coverage -fprofile-update=atomic
                            "-fprofile-exclude-files=^(/usr|${PROJECT_SOURCE_DIR}/(Tests|Fuzz))/")
     target_link_options(velmora_options INTERFACE --coverage)
 elseif(CMAKE_BUILD_TYPE MATCHES "Rel")
-    target_compile_options(velmora_options INTERFACE -U_FORTIFY_SOURCE -D_FORTIFY_SOURCE=2 -fstack-clash-protection)
-    if(CMAKE_SYSTEM_PROCESSOR MATCHES "x86_64|i.86")
-        target_compile_options(velmora_options INTERFACE -fcf-protection)
-    elseif(CMAKE_SYSTEM_PROCESSOR MATCHES "aarch64")
-        target_compile_options(velmora_options INTERFACE -mbranch-protection=standard)
-    endif()
-    # Where it was built is nobody's business and would make two builds of one source differ. The build tree comes
-    # last, since it may lie in the source tree and the last one that fits counts.
+    velmora_harden(velmora_options)
+    # The programs hold no paths of the build, which would make two builds of one source differ. The build tree comes
+    # last, since it may lie in the source tree and the last option that matches applies.
     target_compile_options(velmora_options INTERFACE -ffile-prefix-map=${PROJECT_SOURCE_DIR}=.
                            -ffile-prefix-map=${CMAKE_BINARY_DIR}=build)
-    # What a library is linked for but does not use would become a dependency of the package.
+    # A library that is linked but not used would become a dependency of the package.
     target_link_options(velmora_options INTERFACE -Wl,--as-needed)
 endif()
 
@@ -50,13 +50,16 @@ function(velmora_compile_quickly name)
     target_compile_options(${name} PRIVATE "$<$<CONFIG:Release,RelWithDebInfo>:-O1;-g1>")
 endfunction()
 
-# velmora_uses_regex(FILE...): the compiler takes fright at the standard library's regular expressions when it adds
-# the sanitizers' code; in these sources of the folder it does not say so.
+# velmora_uses_regex(FILE...): turns off a warning in these sources of the folder. With the sanitizers' code added, g++
+# gives it by mistake for the standard library's regular expressions.
 function(velmora_uses_regex)
     if(VELMORA_SANITIZE AND CMAKE_CXX_COMPILER_ID STREQUAL GNU)
         set_source_files_properties(${ARGN} PROPERTIES COMPILE_OPTIONS -Wno-maybe-uninitialized)
     endif()
 endfunction()
+
+# The tests whose code, or the code that they test, starts threads. ./test --threads runs them with the thread sanitizer.
+set(velmora_threaded_tests test-model test-platform-linux test-recording test-tools)
 
 # velmora_test(NAME SOURCES file... [LINK target...] [NEEDS program...]): a GoogleTest executable whose cases
 # CTest runs one by one; all at once where coverage is counted, since every program that ends adds its counts to some
@@ -76,9 +79,13 @@ function(velmora_test name)
         add_test(NAME ${name} COMMAND ${name})
         return()
     endif()
+    set(labels)
+    if(name IN_LIST velmora_threaded_tests)
+        set(labels LABELS threads)
+    endif()
     include(GoogleTest)
     gtest_discover_tests(${name} TEST_PREFIX "${name}." NO_PRETTY_VALUES DISCOVERY_MODE PRE_TEST
-                         PROPERTIES TIMEOUT 60)
+                         PROPERTIES TIMEOUT 60 ${labels})
 endfunction()
 
 # velmora_benchmark(NAME SOURCES file... [LINK target...]): a Google Benchmark executable.

@@ -1,3 +1,5 @@
+# SPDX-FileCopyrightText: 2026 Velmora contributors
+# SPDX-License-Identifier: MIT
 """Recordings that are cut, that have flipped bytes, and that hold shortened messages."""
 
 import random

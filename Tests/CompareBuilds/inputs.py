@@ -1,3 +1,5 @@
+# SPDX-FileCopyrightText: 2026 Velmora contributors
+# SPDX-License-Identifier: MIT
 """What both builds are fed with, made when its turn comes and removed after it."""
 
 import random

@@ -1,3 +1,5 @@
+# SPDX-FileCopyrightText: 2026 Velmora contributors
+# SPDX-License-Identifier: MIT
 """Recordings as the programs write them: little-endian pcapng files of one interface."""
 
 import struct

@@ -1,3 +1,5 @@
+# SPDX-FileCopyrightText: 2026 Velmora contributors
+# SPDX-License-Identifier: MIT
 """The extra stream's property lists, and those of the IFX technology: valid ones of every odd kind."""
 
 import datetime

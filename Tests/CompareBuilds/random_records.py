@@ -1,3 +1,5 @@
+# SPDX-FileCopyrightText: 2026 Velmora contributors
+# SPDX-License-Identifier: MIT
 """Messages of every log code with random lengths and contents, the same for the same seed."""
 
 import random

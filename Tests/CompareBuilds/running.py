@@ -1,3 +1,5 @@
+# SPDX-FileCopyrightText: 2026 Velmora contributors
+# SPDX-License-Identifier: MIT
 """Runs one command with one build and reduces what came of it to what is compared."""
 
 import hashlib

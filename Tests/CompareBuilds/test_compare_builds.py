@@ -1,3 +1,5 @@
+# SPDX-FileCopyrightText: 2026 Velmora contributors
+# SPDX-License-Identifier: MIT
 """What Tests/compare-builds notices, and what it leaves out."""
 
 import base64

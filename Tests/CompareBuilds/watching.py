@@ -1,3 +1,5 @@
+# SPDX-FileCopyrightText: 2026 Velmora contributors
+# SPDX-License-Identifier: MIT
 """`watch` on a pipe: the display that it shows last of a recording that the telephony service has replayed.
 
 When refreshes come depends on the machine, so that those before are not compared: the service plays as fast as its
