@@ -1,4 +1,3 @@
-#!/usr/bin/env python3
 # SPDX-FileCopyrightText: 2026 Velmora contributors
 # SPDX-License-Identifier: MIT
 """Tries the tests of the decoders: changes one operator, number or statement of LogGenerator/ at a time and looks
@@ -32,8 +31,8 @@ import threading
 import time
 from concurrent.futures import ThreadPoolExecutor
 
-SOURCE = os.path.dirname(os.path.dirname(os.path.abspath(__file__)))
-EQUIVALENT = os.path.join(SOURCE, "Tests", "mutations-equivalent")
+SOURCE = os.path.abspath(os.path.join(os.path.dirname(__file__), "..", "..", ".."))
+EQUIVALENT = os.path.join(SOURCE, "Tests", "Mutation", "mutations-equivalent")
 SHARED = "test-log-generator"
 PROGRAMS = {"C2K": "test-c2k", "LTE": "test-lte", "OstrelGSM": "test-ostrel-gsm", "UTRAN": "test-utran"}
 WIDE = 20  # a header that more files than these include is tried with one technology after the other
@@ -380,7 +379,3 @@ def main():
     for path, before, after in sorted(outdated):
         print(f"mutations-equivalent: no longer possible: {path}\n    - {before}\n    + {after}")
     return 1 if counts["survived"] or outdated else 0
-
-
-if __name__ == "__main__":
-    sys.exit(main())

@@ -8,7 +8,7 @@ import subprocess
 import threading
 import time
 
-SOURCE = os.path.dirname(os.path.dirname(os.path.dirname(os.path.abspath(__file__))))
+SOURCE = os.path.abspath(os.path.join(os.path.dirname(__file__), "..", "..", ".."))
 
 
 class Problem(Exception):
