@@ -1,3 +1,3 @@
 # SPDX-FileCopyrightText: 2026 Velmora contributors
 # SPDX-License-Identifier: MIT
-"""Treats the programs badly: kills, hostile clients, floods, failing calls, long drives."""
+"""Stress tests of the programs: kills, hostile clients, floods, failing calls, hours of recorded messages."""
