@@ -5,6 +5,7 @@
 import plistlib
 import socket
 import struct
+import time
 from collections.abc import Mapping
 from pathlib import Path
 from typing import Any
@@ -15,6 +16,7 @@ from velmora_chaos.sandbox import Sandbox
 REQUEST, REPLY, ONE_WAY = 1, 2, 4
 HEADER = struct.Struct("<IiII")  # payload length, message id, flags, serial
 CONNECT_S = 10
+RETRY_S = 0.001
 
 
 def frame(flags: int, payload: bytes, serial: int = 0) -> bytes:
@@ -22,12 +24,23 @@ def frame(flags: int, payload: bytes, serial: int = 0) -> bytes:
     return HEADER.pack(len(payload), 0, flags, serial) + payload
 
 
-def connect(port: Path) -> socket.socket:
-    """A connection to a port."""
+def connect(port: Path, limit_s: float = CONNECT_S) -> socket.socket:
+    """A connection to a port; retried while the queue of those that wait to be accepted is full."""
     connection = socket.socket(socket.AF_UNIX)
-    connection.settimeout(CONNECT_S)
-    connection.connect(str(port))
-    return connection
+    connection.settimeout(limit_s)
+    end = time.monotonic() + limit_s
+    while True:
+        try:
+            connection.connect(str(port))
+            return connection
+        except BlockingIOError:  # a time-out alone does not make the system wait for the queue
+            if time.monotonic() >= end:
+                connection.close()
+                raise
+            time.sleep(RETRY_S)
+        except OSError:
+            connection.close()
+            raise
 
 
 def call(connection: socket.socket, request: Mapping[str, Any]) -> dict[str, Any]:

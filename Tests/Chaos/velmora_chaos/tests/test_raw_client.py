@@ -5,13 +5,15 @@
 import plistlib
 import random
 import socket
+import tempfile
 import threading
 import unittest
+from pathlib import Path
 from typing import Any
 
 from velmora_chaos.checks import Problem
 from velmora_chaos.malformed import VARIANTS, malformed_input, malformed_variant
-from velmora_chaos.raw_client import ONE_WAY, REPLY, REQUEST, call, frame
+from velmora_chaos.raw_client import ONE_WAY, REPLY, REQUEST, call, connect, frame
 
 
 def reply_with(data: bytes, request: dict[str, Any]) -> tuple[dict[str, Any], bytes]:
@@ -58,6 +60,36 @@ class CallTest(unittest.TestCase):
     def test_a_reply_that_is_not_a_dictionary_is_reported(self) -> None:
         with self.assertRaisesRegex(Problem, "^the reply is not a dictionary$"):
             reply_with(frame(REPLY, plistlib.dumps([1]), 1), {})
+
+
+class ConnectTest(unittest.TestCase):
+    def setUp(self) -> None:
+        temporary = tempfile.TemporaryDirectory()
+        self.addCleanup(temporary.cleanup)
+        self.port = Path(temporary.name, "port")
+        self.listening = socket.socket(socket.AF_UNIX)
+        self.addCleanup(self.listening.close)
+        self.listening.bind(str(self.port))
+        self.listening.listen(0)
+        self.waiting = connect(self.port)  # fills the queue
+        self.addCleanup(self.waiting.close)
+
+    def test_waits_while_the_queue_is_full(self) -> None:
+        accepted: list[socket.socket] = []
+        thread = threading.Timer(0.05, lambda: accepted.append(self.listening.accept()[0]))
+        thread.start()
+        connect(self.port).close()
+        thread.join()
+        accepted[0].close()
+
+    def test_gives_up_after_the_limit(self) -> None:
+        with self.assertRaises(BlockingIOError):
+            connect(self.port, limit_s=0.02)
+
+    def test_a_port_without_an_owner_is_refused_at_once(self) -> None:
+        self.listening.close()
+        with self.assertRaises(ConnectionRefusedError):
+            connect(self.port)
 
 
 class MalformedInputTest(unittest.TestCase):
