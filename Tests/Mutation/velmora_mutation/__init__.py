@@ -1,3 +1,3 @@
 # SPDX-FileCopyrightText: 2026 Velmora contributors
 # SPDX-License-Identifier: MIT
-"""Tries the tests of the decoders: changes the decoders and runs the tests."""
+"""Mutation testing of the decoders: changes them in one place at a time and checks that a test fails."""
