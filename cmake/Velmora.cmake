@@ -86,7 +86,7 @@ endfunction()
 function(velmora_python_tests name package)
     add_test(NAME ${name}-scripts COMMAND python3 -m unittest discover -t . -s ${package}
              WORKING_DIRECTORY ${CMAKE_CURRENT_SOURCE_DIR})
-    set_tests_properties(${name}-scripts PROPERTIES LABELS scripts TIMEOUT 60
+    set_tests_properties(${name}-scripts PROPERTIES LABELS scripts TIMEOUT 600
                          ENVIRONMENT PYTHONPYCACHEPREFIX=${CMAKE_BINARY_DIR}/pycache)
     find_program(MYPY mypy)
     if(MYPY)
