@@ -88,6 +88,22 @@ function(velmora_test name)
                          PROPERTIES TIMEOUT 60 ${labels})
 endfunction()
 
+# velmora_python_tests(NAME PACKAGE [SCRIPT...]): runs the unit tests of a Python package of this folder, and, where mypy
+# is installed, checks its types and those of the scripts that start it.
+function(velmora_python_tests name package)
+    add_test(NAME ${name}-scripts COMMAND python3 -m unittest discover -t . -s ${package}
+             WORKING_DIRECTORY ${CMAKE_CURRENT_SOURCE_DIR})
+    set_tests_properties(${name}-scripts PROPERTIES LABELS scripts TIMEOUT 600
+                         ENVIRONMENT PYTHONPYCACHEPREFIX=${CMAKE_BINARY_DIR}/pycache)
+    find_program(MYPY mypy)
+    if(MYPY)
+        add_test(NAME ${name}-scripts-types COMMAND ${MYPY} --strict --scripts-are-modules
+                 --cache-dir=${CMAKE_BINARY_DIR}/mypy/${name} ${package} ${ARGN}
+                 WORKING_DIRECTORY ${CMAKE_CURRENT_SOURCE_DIR})
+        set_tests_properties(${name}-scripts-types PROPERTIES LABELS scripts TIMEOUT 180)
+    endif()
+endfunction()
+
 # velmora_benchmark(NAME SOURCES file... [LINK target...]): a Google Benchmark executable.
 function(velmora_benchmark name)
     cmake_parse_arguments(PARSE_ARGV 1 arg "" "" "SOURCES;LINK")

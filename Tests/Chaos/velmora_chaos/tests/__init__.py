@@ -1,0 +1,3 @@
+# SPDX-FileCopyrightText: 2026 Velmora contributors
+# SPDX-License-Identifier: MIT
+"""Tests of the package: `python3 -m unittest discover -t . -s velmora_chaos` in the folder above it."""
