@@ -16,7 +16,7 @@
 
 namespace velmora {
 
-/// A view of bytes that somebody else owns.
+/// A view of bytes; it does not own them.
 using Bytes = std::span<const std::uint8_t>;
 
 /// The number that begins at `bytes`, which must hold all of it. A single load, which compilers do not make

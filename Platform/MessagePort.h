@@ -43,7 +43,7 @@ public:
     virtual void invalidate() = 0;
 };
 
-/// The other end of somebody's local port. Valid while its connection is. Main thread only.
+/// The other end of another process's local port. Valid while its connection is. Main thread only.
 class RemotePort {
 public:
     struct Answer {

@@ -10,7 +10,7 @@
 namespace velmora {
 
 /// Why something could not be done: lower-case prose without a full stop that gives the value found and the
-/// value wanted, ready to stand behind "file: " in a message.
+/// value wanted, ready to follow "file: " in a message.
 struct Failure {
     std::string reason;
 };

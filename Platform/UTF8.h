@@ -12,8 +12,8 @@ namespace velmora {
 
 /// Strict UTF-8 as Unicode defines it: shortest form, no surrogates, nothing above U+10FFFF.
 
-/// The character that begins at `offset`, which moves behind it; nothing, and `offset` stays, where none
-/// does.
+/// The character that begins at `offset`, which moves past it; none, and `offset` stays, where the bytes are
+/// no character.
 [[nodiscard]] std::optional<char32_t> nextCharacter(std::string_view text, std::size_t& offset);
 
 /// The offset of the first byte that belongs to no character; absent where the text is all valid.

@@ -3,14 +3,12 @@
 
 #include "Platform/UTF8.h"
 #include "PropertyLists/BinaryObjectTable.h"
+#include "PropertyLists/BinaryScalars.h"
 #include "PropertyLists/PropertyList.h"
-#include "PropertyLists/PropertyListDate.h"
 
 #include <algorithm>
-#include <bit>
-#include <cmath>
-#include <limits>
 #include <string_view>
+#include <utility>
 
 namespace velmora {
 
@@ -40,16 +38,19 @@ private:
         return fail(failureAt(offset, reason).reason);
     }
 
+    bool take(Result<Value> scalar, Value& value) {
+        if (!scalar)
+            return fail(scalar.reason());
+        value = *std::move(scalar);
+        return true;
+    }
+
     [[nodiscard]] std::size_t bytesLeft(const BinaryObject& object) const {
         return _table.end() - object.content;
     }
 
     bool readObject(std::uint64_t index, std::size_t depth, Value& value);
     bool readCount(BinaryObject& object);
-    bool expectContent(const BinaryObject& object, std::size_t size);
-    bool readInteger(const BinaryObject& object, Value& value);
-    bool readReal(const BinaryObject& object, Value& value);
-    bool readDate(const BinaryObject& object, Value& value);
     bool readData(const BinaryObject& object, Value& value);
     bool readASCII(const BinaryObject& object, Value& value);
     bool readUTF16(const BinaryObject& object, Value& value);
@@ -73,14 +74,6 @@ bool Reader::readCount(BinaryObject& object) {
     return done || fail(done.reason());
 }
 
-bool Reader::expectContent(const BinaryObject& object, std::size_t size) {
-    if (size <= bytesLeft(object))
-        return true;
-    return failAt(object.offset, "the object with marker " + hexByte(object.marker) + " needs " +
-                                     std::to_string(size) + " bytes, " + std::to_string(bytesLeft(object)) +
-                                     " are left");
-}
-
 bool Reader::readObject(std::uint64_t index, std::size_t depth, Value& value) {
     if (_objectsLeft == 0)
         return fail("the list has more than " + std::to_string(_limits.maximumObjects) + " objects");
@@ -96,9 +89,9 @@ bool Reader::readObject(std::uint64_t index, std::size_t depth, Value& value) {
             break;
         value = object.marker == 0x09;
         return true;
-    case 0x1: return readInteger(object, value);
-    case 0x2: return readReal(object, value);
-    case 0x3: return readDate(object, value);
+    case 0x1: return take(binaryInteger(_table, object), value);
+    case 0x2: return take(binaryReal(_table, object), value);
+    case 0x3: return take(binaryDate(_table, object), value);
     case 0x4: return readCount(object) && readData(object, value);
     case 0x5: return readCount(object) && readASCII(object, value);
     case 0x6: return readCount(object) && readUTF16(object, value);
@@ -107,53 +100,6 @@ bool Reader::readObject(std::uint64_t index, std::size_t depth, Value& value) {
     default: break;
     }
     return failAt(object.offset, "marker " + hexByte(object.marker) + " stands for no value that is read");
-}
-
-/// Numbers of 1, 2 and 4 bytes have no sign, those of 8 and 16 have.
-bool Reader::readInteger(const BinaryObject& object, Value& value) {
-    const int power = object.marker & 0x0F;
-    if (power > 4)
-        return failAt(object.offset,
-                      "an integer has marker " + hexByte(object.marker) + ", not 0x10 to 0x14");
-    const std::size_t size = std::size_t{1} << power;
-    if (!expectContent(object, size))
-        return false;
-    if (size == 16) {
-        const std::uint64_t high = _table.numberAt(object.content, 8);
-        const auto low = static_cast<std::int64_t>(_table.numberAt(object.content + 8, 8));
-        if (high != (low < 0 ? std::numeric_limits<std::uint64_t>::max() : 0))
-            return failAt(object.offset, "an integer of 16 bytes does not fit 64 bits");
-        value = low;
-        return true;
-    }
-    value = static_cast<std::int64_t>(_table.numberAt(object.content, size));
-    return true;
-}
-
-bool Reader::readReal(const BinaryObject& object, Value& value) {
-    if (object.marker != 0x22 && object.marker != 0x23)
-        return failAt(object.offset, "a real has marker " + hexByte(object.marker) + ", not 0x22 or 0x23");
-    const std::size_t size = object.marker == 0x22 ? 4 : 8;
-    if (!expectContent(object, size))
-        return false;
-    const std::uint64_t bits = _table.numberAt(object.content, size);
-    value = size == 4 ? static_cast<double>(std::bit_cast<float>(static_cast<std::uint32_t>(bits)))
-                      : std::bit_cast<double>(bits);
-    return true;
-}
-
-bool Reader::readDate(const BinaryObject& object, Value& value) {
-    if (object.marker != 0x33)
-        return failAt(object.offset, "a date has marker " + hexByte(object.marker) + ", not 0x33");
-    if (!expectContent(object, 8))
-        return false;
-    const double seconds = std::floor(std::bit_cast<double>(_table.numberAt(object.content, 8)));
-    const auto secondsTo = [](Date date) { return static_cast<double>((date - binaryDateEpoch).count()); };
-    // Written so that a NaN fails as well.
-    if (!(seconds >= secondsTo(earliestDate) && seconds <= secondsTo(latestDate)))
-        return failAt(object.offset, "a date lies outside the years 0001 to 9999");
-    value = binaryDateEpoch + std::chrono::seconds(static_cast<std::int64_t>(seconds));
-    return true;
 }
 
 bool Reader::takeContent(const BinaryObject& object, std::size_t size) {

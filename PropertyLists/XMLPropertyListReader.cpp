@@ -2,30 +2,19 @@
 // SPDX-License-Identifier: MIT
 
 #include "PropertyLists/PropertyList.h"
-#include "PropertyLists/PugixmlMemoryBudget.h"
+#include "PropertyLists/XMLDocument.h"
 #include "PropertyLists/XMLScalars.h"
 #include "PropertyLists/XMLText.h"
 
 #include <pugixml.hpp>
 
 #include <algorithm>
-#include <cctype>
-#include <limits>
-#include <new>
+#include <string>
 #include <string_view>
 
 namespace velmora {
 
 namespace {
-
-/// What a document may take: a node for each value or key and one for the white space behind it, with room
-/// for comments' and sections' pieces, whatever a caller's limit is.
-std::size_t documentBytes(std::size_t objects) {
-    constexpr std::size_t bytesAnObject = 256;
-    constexpr std::size_t anyDocument = std::size_t{256} * 1024;
-    constexpr std::size_t most = std::numeric_limits<std::size_t>::max() - anyDocument;
-    return (objects > most / bytesAnObject ? most : objects * bytesAnObject) + anyDocument;
-}
 
 /// Text as messages show it.
 std::string quoted(std::string_view text) {
@@ -45,12 +34,12 @@ bool isSpace(std::string_view text) {
 /// Turns the parsed document into a value. A function that fails returns false and has set the reason.
 class Reader {
 public:
-    Reader(Bytes input, const PropertyListLimits& limits)
-        : _input(input), _limits(limits), _objectsLeft(limits.maximumObjects) {}
+    Reader(const XMLDocument& document, const PropertyListLimits& limits)
+        : _document(document), _limits(limits), _objectsLeft(limits.maximumObjects) {}
 
     Result<Value> read() {
         Value root;
-        if (!parse() || !readDocument(root))
+        if (!readDocument(root))
             return Failure{_reason};
         return root;
     }
@@ -61,18 +50,12 @@ private:
         return false;
     }
     bool failAt(std::size_t offset, const std::string& reason) {
-        return fail("offset " + std::to_string(offset) + ": " + reason);
+        return fail(XMLDocument::failureAt(offset, reason).reason);
     }
-    bool failAt(pugi::xml_node node, const std::string& reason) { return failAt(offsetOf(node), reason); }
-
-    /// Where an element's "<", or a piece of text, stands in the input.
-    [[nodiscard]] std::size_t offsetOf(pugi::xml_node node) const {
-        const bool isElement = node.type() == pugi::node_element;
-        const char* start = isElement ? node.name() : node.value();
-        return static_cast<std::size_t>(start - _text.data()) - (isElement ? 1 : 0);
+    bool failAt(pugi::xml_node node, const std::string& reason) {
+        return failAt(_document.offsetOf(node), reason);
     }
 
-    bool parse();
     bool readDocument(Value& value);
     bool readPlist(pugi::xml_node plist, Value& value);
     bool readValue(pugi::xml_node element, std::size_t depth, Value& value);
@@ -85,45 +68,13 @@ private:
     bool expectNoText(pugi::xml_node element);
     bool nextElement(pugi::xml_node parent, pugi::xml_node& element);
 
-    Bytes _input;
+    const XMLDocument& _document;
     const PropertyListLimits& _limits;
     std::size_t _objectsLeft;
-    /// The input, which pugixml takes apart in place, and a zero byte. Outlives the document.
-    std::string _text;
-    pugi::xml_document _document;
     std::string _reason;
 };
 
-bool Reader::parse() {
-    if (_input.size() > _limits.maximumBytes)
-        return fail("the list has " + std::to_string(_input.size()) + " bytes, more than " +
-                    std::to_string(_limits.maximumBytes));
-    _text.resize(_input.size());
-    std::copy(_input.begin(), _input.end(), _text.begin());
-    // This also keeps zero bytes away from pugixml, which ends there.
-    if (const auto offset = firstNotXML(_text))
-        return failAt(*offset, "no character of XML in UTF-8");
-
-    // Text comes as it stands in the document: pugixml would pass unknown references as text and end a string
-    // at "&#0;". White space is kept because it may be part of a string that has comments or sections in it.
-    constexpr unsigned options = pugi::parse_cdata | pugi::parse_eol | pugi::parse_ws_pcdata |
-                                 pugi::parse_embed_pcdata | pugi::parse_fragment;
-    const PugixmlMemoryBudget budget(documentBytes(_limits.maximumObjects));
-    const pugi::xml_parse_result result =
-        _document.load_buffer_inplace(_text.data(), _text.size() + 1, options, pugi::encoding_utf8);
-    if (result)
-        return true;
-    if (result.status == pugi::status_out_of_memory && !budget.isExhausted())
-        throw std::bad_alloc();
-    if (result.status == pugi::status_out_of_memory)
-        return fail("the list has more tags and attributes than " + std::to_string(_limits.maximumObjects) +
-                    " objects need");
-    std::string description = result.description();
-    description[0] = static_cast<char>(std::tolower(static_cast<unsigned char>(description[0])));
-    return failAt(static_cast<std::size_t>(std::max<std::ptrdiff_t>(result.offset, 0)), description);
-}
-
-/// The next element behind `element`, or the first one where that is null; null at the end. Only white space
+/// The next element after `element`, or the first one where that is null; null at the end. Only white space
 /// may stand between elements.
 bool Reader::nextElement(pugi::xml_node parent, pugi::xml_node& element) {
     element = element ? element.next_sibling() : parent.first_child();
@@ -141,8 +92,7 @@ bool Reader::expectNoText(pugi::xml_node element) {
     const std::string_view text = element.value();
     if (isSpace(text))
         return true;
-    return failAt(static_cast<std::size_t>(text.data() - _text.data()),
-                  "text " + quoted(text) + " where an element was wanted");
+    return failAt(_document.offsetOf(text), "text " + quoted(text) + " where an element was wanted");
 }
 
 bool Reader::readDocument(Value& value) {
@@ -282,15 +232,14 @@ bool Reader::readScalar(pugi::xml_node element, std::string_view name, Value& va
 bool Reader::readText(pugi::xml_node element, std::string& text) {
     text.clear();
     const std::string_view first = element.value();
-    if (!first.empty() &&
-        !appendUnescaped(first, static_cast<std::size_t>(first.data() - _text.data()), text))
+    if (!first.empty() && !appendUnescaped(first, _document.offsetOf(first), text))
         return false;
     for (const pugi::xml_node piece : element.children()) {
         if (piece.type() == pugi::node_element)
             return failAt(piece, "<" + std::string(piece.name()) + "> inside <" + element.name() + ">");
         if (piece.type() == pugi::node_cdata)
             text += piece.value();
-        else if (!appendUnescaped(piece.value(), offsetOf(piece), text))
+        else if (!appendUnescaped(piece.value(), _document.offsetOf(piece), text))
             return false;
     }
     return true;
@@ -312,7 +261,10 @@ bool Reader::appendUnescaped(std::string_view piece, std::size_t offset, std::st
 } // namespace
 
 Result<Value> readXMLPropertyList(Bytes input, const PropertyListLimits& limits) {
-    return Reader(input, limits).read();
+    XMLDocument document;
+    if (const Result<Done> parsed = document.parse(input, limits); !parsed)
+        return Failure{parsed.reason()};
+    return Reader(document, limits).read();
 }
 
 } // namespace velmora

@@ -42,8 +42,8 @@ struct Loss {
     bool isTail = false; ///< the file ends within a record, as when its writer was stopped
 };
 
-/// A file read as a stream of log messages, front to back, whatever its form. What cannot be read is left out
-/// and told as a loss; what follows it is still read. Main thread only.
+/// A file read as a stream of log messages, front to back, whatever its form. What cannot be read is skipped
+/// and reported as a loss; what follows it is still read. Main thread only.
 class MessageReader {
 public:
     /// How many losses are kept one by one; the totals count them all.
@@ -58,7 +58,7 @@ public:
     MessageReader(const MessageReader&) = delete;
     MessageReader& operator=(const MessageReader&) = delete;
 
-    /// The next message; none at the end of the file, or when reading failed (see `failure`), and ever after.
+    /// The next message; none at the end of the file, or once reading has failed (see `failure`).
     [[nodiscard]] virtual std::optional<LoggedMessage> next() = 0;
     /// The short name of the technology whose messages these are ("Ostrel_GSM"); empty while it is unknown.
     [[nodiscard]] virtual const std::string& technology() const = 0;

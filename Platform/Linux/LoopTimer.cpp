@@ -14,7 +14,7 @@ class LoopTimer::Impl : public QTimer {
 public:
     explicit Impl(std::function<void()> action) : _action(std::move(action)) {
         setTimerType(Qt::PreciseTimer);
-        // An exception that nobody catches ends the program here, not somewhere inside the event loop.
+        // An uncaught exception ends the program here, not somewhere inside the event loop.
         callOnTimeout(this, [this]() noexcept { run(); });
     }
 

@@ -8,9 +8,9 @@
 
 namespace velmora {
 
-/// The service manager that started this program, as the program sees it: it is told how far the program has
-/// come, by datagrams to the socket that $NOTIFY_SOCKET names. Where the variable is not set nobody wants to
-/// know, and nothing is sent. What cannot be sent is an error line; the program goes on.
+/// Notifies the service manager that started this program of its state, by datagrams to the socket that
+/// $NOTIFY_SOCKET names (see sd_notify). Where the variable is not set, nothing is sent. What cannot be sent
+/// is an error line; the program goes on.
 class ServiceManager {
 public:
     /// Takes the socket's name from the environment.

@@ -17,20 +17,20 @@
 namespace velmora {
 
 /// Writes a DLF log: the version report, then one record a message, so that DLFReader gives the same messages
-/// again, byte for byte. A record goes without its type byte, as the format has it, where its code tells
-/// which it was: 1, or 0xFF for the codes 0 to 2. Any other message is written as it arrived, with type byte
-/// and prefix, as stands in the application's own logs.
+/// again, byte for byte. A record is written without its type byte, as the format has it, where its code
+/// implies the type (see impliedType). Any other message is written as it arrived, with type byte and prefix,
+/// as in the application's own logs.
 ///
-/// The log keeps no times but those in the records. A message that could not be followed in it, because it
-/// has no whole header or its length field is not its length, is refused. Once writing has failed every call
-/// gives that failure again and nothing more is written. Owns its file; destroying it closes it as `close`
-/// does, but tells nobody how that went. Main thread only.
+/// The log keeps no times but those in the records. A message that a reader could not find the end of,
+/// because it has no whole header or its length field is not its length, is refused. Once writing has failed
+/// every call returns that failure again and nothing more is written. Owns its file; destroying it closes it
+/// as `close` does, but reports no failure. Main thread only.
 class DLFWriter {
 public:
     /// Creates the file, or empties it; "-" is standard output, which stays open afterwards. The version
     /// report, with the clock's time and what the resources say of this program, is written at once.
     static Result<std::unique_ptr<DLFWriter>> create(const std::string& path, const Clock& clock);
-    /// Writes to an open descriptor, which it takes over; `name` is what failures call it.
+    /// Writes to an open descriptor, which it takes over; failures name it `name`.
     static Result<std::unique_ptr<DLFWriter>> adopt(int descriptor, std::string name, const Clock& clock);
     /// Writes to any file of which nothing has been written.
     static Result<std::unique_ptr<DLFWriter>> start(std::unique_ptr<RecordingFile> file, std::string name,
@@ -43,15 +43,14 @@ public:
     /// Adds a message as it arrived. Fails for one that a log cannot hold, which does not end it and is
     /// counted. Precondition: it has not been closed.
     Result<Done> append(Bytes message);
-    /// Writes all messages so far, has the system put the file on its medium, and closes it. The second call
-    /// does nothing.
+    /// Writes all messages so far, syncs and closes the file. A second call does nothing.
     Result<Done> close();
 
     /// Messages added so far.
     [[nodiscard]] std::uint64_t messages() const { return _messages; }
     /// Messages that a log cannot hold.
     [[nodiscard]] std::uint64_t refused() const { return _refused; }
-    /// Whether writing has failed, for good.
+    /// Whether writing has failed.
     [[nodiscard]] bool hasFailed() const { return _failure.has_value(); }
 
 private:

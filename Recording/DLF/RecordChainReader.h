@@ -15,11 +15,10 @@
 
 namespace velmora {
 
-/// What the readers of files share that hold bare log records and do not name their technology: it is told
+/// The base of readers of files that hold bare log records and do not name their technology, which is derived
 /// from the log codes. Opening such a file looks ahead until one technology's decoder wants three messages
-/// more than any other's, at most over 1000 messages or 1 MiB of them, which are kept; then the one that
-/// wants most of them is it. Where two want as many, or none does, the technology stays unknown. Main thread
-/// only.
+/// more than any other's, over at most 1000 messages or 1 MiB of them, which are queued; the technology that
+/// wants most of them is it. With a tie, or no message that any wants, it stays unknown. Main thread only.
 class RecordChainReader : public MessageReader {
 public:
     static constexpr std::size_t maximumLookAhead = 1000;
@@ -29,21 +28,21 @@ public:
     [[nodiscard]] const std::string& technology() const final { return _technology; }
 
 protected:
-    /// The next message; none at the end, and ever after.
+    /// The next message; none once the end has been reached.
     [[nodiscard]] virtual std::optional<LoggedMessage> read() = 0;
-    /// To be called once, by what opens the file.
+    /// Called once, by the function that opens the file.
     void lookAhead();
-    /// What the file's form alone tells.
+    /// For a file whose form alone determines the technology.
     void setTechnology(std::string_view technology) { _technology = technology; }
 
-    /// The chain's next record, with its number and offset and without a time. Version reports are passed
-    /// over and have numbers. Losses are told with `place` before their reason.
+    /// The chain's next record, with its number and offset and without a time. Version reports are skipped
+    /// and have numbers. Losses are reported with `place` before their reason.
     [[nodiscard]] std::optional<RecordChain::Record> nextRecord(RecordChain& chain, std::string_view place);
-    /// The number of the record that was given last.
+    /// The number of the record that was returned last.
     [[nodiscard]] std::uint64_t number() const { return _number; }
-    /// Something that would have been the next record and gave no message.
+    /// Reports that the next record gives no message.
     void loseRecord(std::uint64_t bytes, std::string reason);
-    /// Counts a record that is none of a chain's.
+    /// Counts a record that is not part of a chain.
     void countRecord() { ++_number; }
     /// The time that the record's stamp means; for a stamp of 0, and for one that means none, that of the
     /// last record with a good one.

@@ -26,8 +26,7 @@ bool ChunkedInput::fill(std::size_t count) {
         const std::size_t wanted = std::min(count, std::max(2 * (_end - _begin), _chunkSize));
         if (_chunk->size() - _begin < wanted || _chunk->size() - _end < smallestRead)
             turnOver(wanted);
-        // Bytes behind _end have never been handed out, so that they may be written in a chunk that others
-        // hold.
+        // Bytes after _end have never been handed out, so that they may be written in a chunk that is shared.
         const Result<std::size_t> got = _source->read(std::span(*_chunk).subspan(_end));
         if (!got) {
             _failure = Failure{got.reason() + " at offset " + std::to_string(_offset + (_end - _begin))};

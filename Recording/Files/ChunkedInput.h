@@ -15,13 +15,13 @@
 
 namespace velmora {
 
-/// A moving window on a source of any length, for readers that look ahead a bounded way and hand parts of
-/// what they see out without a copy.
+/// A sliding window on a source of any length, for readers with a bounded look-ahead that hand out parts of
+/// the input without a copy.
 ///
-/// The bytes lie in chunks. `part` gives a window on the chunk itself: it stays good after the input has
-/// moved on, but keeps its whole chunk in memory; who keeps one for long, copies it. A chunk that nobody
-/// holds a part of is used again. Chunks have the given size, but where one look-ahead asks for more: then
-/// they grow with the bytes that come, up to about twice what it asked for. Main thread only.
+/// The bytes lie in chunks. `part` returns a window on the chunk itself: it stays valid after the input has
+/// moved on, but keeps its whole chunk in memory; copy a part that is kept for long. A chunk without
+/// references is reused. Chunks have the given size, except where one look-ahead asks for more: then they
+/// grow with the bytes that arrive, up to about twice what it asked for. Main thread only.
 class ChunkedInput {
 public:
     /// Two of them come to much less than a mebibyte, so that the second, which is made once the first has

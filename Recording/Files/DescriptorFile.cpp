@@ -32,7 +32,7 @@ DescriptorFile::DescriptorFile(int descriptor, bool owned) : _descriptor(descrip
         return;
     const bool appends = (::fcntl(_descriptor, F_GETFL) & O_APPEND) != 0;
     const off_t start = appends ? status.st_size : ::lseek(_descriptor, 0, SEEK_CUR);
-    // In the middle of somebody's file, taking back would take what stands behind as well.
+    // In the middle of an existing file, truncating would remove what follows as well.
     _regular = start == status.st_size;
     _start = static_cast<std::uint64_t>(start);
 }
@@ -65,7 +65,7 @@ void DescriptorFile::startSync() {
         return;
     try {
         _syncing = std::async(std::launch::async, syncDescriptor, _descriptor);
-    } catch (const std::system_error&) { // no thread to be had
+    } catch (const std::system_error&) { // no thread could be started
         _syncing = std::async(std::launch::deferred, syncDescriptor, _descriptor);
         _syncing.wait();
     }

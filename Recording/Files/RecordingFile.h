@@ -22,20 +22,19 @@ public:
 
     virtual ~RecordingFile() = default;
 
-    /// Writes bytes behind those written before, some at least unless there is an error. Waits where the
-    /// reader of a pipe does.
+    /// Appends bytes, at least one unless there is an error. Blocks while a pipe is full.
     virtual Written write(Bytes bytes) = 0;
-    /// Whether what is written can be taken back and put on a medium, as in a regular file. The operations
-    /// below are for such files alone.
+    /// Whether the file can be truncated and synced, as a regular file can. The operations below are for such
+    /// files only.
     [[nodiscard]] virtual bool isRegular() const = 0;
-    /// Takes back all but the first `size` bytes that were written; the next ones go behind these.
+    /// Truncates the file to the first `size` bytes that were written; writing goes on after these.
     virtual int cutTo(std::uint64_t size) = 0;
-    /// Begins to have all that was written put on the medium, and does not wait for it. Does nothing while an
-    /// earlier call's outcome has not been taken.
+    /// Starts to sync all that was written, in the background. Does nothing while an earlier call's outcome
+    /// has not been taken.
     virtual void startSync() = 0;
-    /// How `startSync` ended; none while it goes on, and once the outcome has been taken.
+    /// How `startSync` ended; none while it is running, and once the outcome has been taken.
     virtual std::optional<int> takeSyncOutcome() = 0;
-    /// Has all that was written put on the medium, and waits for it. An earlier call's outcome is gone then.
+    /// Syncs all that was written and waits for it. Discards the outcome of `startSync`.
     virtual int sync() = 0;
     /// The last call.
     virtual int close() = 0;

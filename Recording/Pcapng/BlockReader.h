@@ -14,9 +14,9 @@
 
 namespace velmora {
 
-/// Takes a pcapng file apart into its blocks. Where a block does not hold together, goes on at the next one
-/// that does: they lie on 4-byte boundaries, but a section header is looked for at every byte, so that a
-/// recording appended to one that was cut off is found. Main thread only.
+/// Splits a pcapng file into its blocks. Where a block is damaged, resumes at the next one that is not:
+/// blocks lie on 4-byte boundaries, but a section header is looked for at every byte, so that a recording
+/// appended to one that was cut off is found. Main thread only.
 class BlockReader {
 public:
     struct Block {
@@ -36,12 +36,11 @@ public:
 
     explicit BlockReader(ChunkedInput input) : _input(std::move(input)) {}
 
-    /// Whether the input begins as a pcapng file does; to be asked before the first `next`.
+    /// Whether the input begins as a pcapng file does. Call it before the first `next`.
     [[nodiscard]] Result<Done> expectSection();
-    /// The next whole block, good until the next call; null at the end, or when reading failed, and ever
-    /// after.
+    /// The next whole block, valid until the next call; null at the end or once reading has failed.
     [[nodiscard]] const Block* next();
-    /// What was left out before the block, or the end, that `next` last gave; without its record number.
+    /// What was skipped before the block, or the end, that `next` last returned; without its record number.
     [[nodiscard]] bool hasLoss() const { return _loss.has_value(); }
     [[nodiscard]] std::optional<Loss> takeLoss() { return std::exchange(_loss, std::nullopt); }
     /// A shared window on the block that `next` last gave. Precondition: it lies inside the block.

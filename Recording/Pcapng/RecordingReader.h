@@ -19,16 +19,15 @@ namespace velmora {
 
 /// Reads a recording: a pcapng file whose packets, on interfaces of link type 147, are log messages.
 ///
-/// Takes what capture tools make of recordings when they cut and merge them: both byte orders, several
-/// sections and interfaces, any time resolution, all three kinds of packet blocks; blocks without packets are
-/// passed over. An interface's name is its technology. The first one named is the recording's; messages of
-/// interfaces without a name belong to it as well, those of another technology are losses. Interfaces of
-/// other link types are counted and otherwise left alone.
+/// Reads what capture tools make of recordings when they cut and merge them: both byte orders, several
+/// sections and interfaces, any time resolution, all three kinds of packet blocks; other blocks are skipped.
+/// An interface's name is its technology. The first one named is the recording's; messages of interfaces
+/// without a name belong to it as well, those of another technology are losses. Interfaces of other link
+/// types are counted and otherwise left alone.
 ///
-/// Where a block is damaged, reading goes on at the next block that holds together. Memory is bounded
-/// whatever the file holds; a message is a window on the reader's 1 MiB chunk and keeps that alive: who keeps
-/// messages for long, copies them. A message's number is the packet's place in the file, as capture tools
-/// count. Main thread only.
+/// Where a block is damaged, reading resumes at the next block that is not. Memory is bounded whatever the
+/// file holds; a message is a window on the reader's chunk and keeps that alive: copy messages that are kept
+/// for long. A message's number is the packet's place in the file, as capture tools count. Main thread only.
 class RecordingReader final : public MessageReader {
 public:
     /// What was passed over because it is none of ours.

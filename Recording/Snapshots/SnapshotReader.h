@@ -18,7 +18,7 @@ namespace velmora {
 /// is the history's entries, oldest first, and for the binary technologies a DLF log.
 ///
 /// An entry stands for one refresh. Its "DisplayState" is the raw material that the refresh had: of the
-/// binary technologies the messages as they arrived, one behind the other; of the serialized-object
+/// binary technologies the messages as they arrived, one after the other; of the serialized-object
 /// technology the object of the last message before it, which is given as the one message of the entry,
 /// serialized anew. An entry without raw material is left out; where no entry has any, the messages are those
 /// of the DLF log, if there is one, with the times that DLFReader gives them.

@@ -12,14 +12,14 @@
 
 namespace velmora {
 
-/// What now and then is odd about a message. Decoders have to bear all of it.
+/// What is odd about a message now and then. Decoders have to cope with all of it.
 enum class Damage : std::uint8_t {
     CutShort,     ///< five bytes of a record: too short to be looked at
     WrongType,    ///< a type byte of 2
     BelowMinimum, ///< a well-framed record that is shorter than its section's least length
     Prefixed,     ///< a prefix before a good record: odd, but nothing is wrong with it
     CountOverrun, ///< a count byte that promises more entries than the record holds
-    UnknownCode,  ///< a good record of a code that nobody subscribes to
+    UnknownCode,  ///< a good record of a code that no decoder wants
 };
 inline constexpr std::array everyDamage = {Damage::CutShort, Damage::WrongType,    Damage::BelowMinimum,
                                            Damage::Prefixed, Damage::CountOverrun, Damage::UnknownCode};

@@ -11,7 +11,7 @@
 
 namespace velmora {
 
-/// Changes the phone of a scenario and gives the record that tells of it, or nothing where there is none to
+/// Changes the phone of a scenario and returns the record that reports it, or nothing where there is none to
 /// send.
 using DriveStep = std::function<std::optional<RecordBuilder>()>;
 

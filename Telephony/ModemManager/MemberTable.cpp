@@ -44,7 +44,7 @@ constexpr MemberRow sets(Of of, std::string_view member, MemberUse use, std::str
     return {of, member, use, key, conversion, note};
 }
 
-/// A member that the service itself goes by.
+/// A member that the service itself uses.
 constexpr MemberRow serves(Of of, std::string_view member, std::string_view note) {
     return {of, member, Service, {}, nullptr, note};
 }
@@ -129,7 +129,7 @@ constexpr MemberRow table[] = {
     sets  (Of::NRSignal,         "snr",                 Link,        "NR SNR",                    ratioText,           "dB"),
     sets  (Of::NRSignal,         "error-rate",          Link,        "NR Block Error Rate",       percentText,         "per cent"),
     unused(Of::CDMASignal,       "*",                   "CDMA2000 is no technology of the live display"),
-    serves(Of::Signal,           "Rate",                "seconds; put back as it was when nobody listens any more"),
+    serves(Of::Signal,           "Rate",                "seconds; restored when the last client has gone"),
     unused(Of::Signal,           "RssiThreshold",       "levels are polled"),
     unused(Of::Signal,           "ErrorRateThreshold",  "levels are polled"),
 

@@ -44,7 +44,7 @@ enum class MemberUse : std::uint8_t {
     SIMFile,     ///< the SIM's files
     Bearer,      ///< a bearer's dictionary of display values among the packet-data contexts
     Link,        ///< every bearer's dictionary: the radio link that carries it
-    Service,     ///< no record: the service itself goes by it
+    Service,     ///< no record: the service itself uses it
     Nothing,     ///< it is left unused
 };
 

@@ -18,7 +18,7 @@
 
 namespace velmora {
 
-/// Asks the followed modem for as long as it lives, which is while somebody listens and that modem is there:
+/// Asks the followed modem for as long as it lives, which is while a client listens and that modem is there:
 /// its cells at a steady pace, its SIM and bearers once and then by their signals. It has ModemManager poll
 /// the levels too, and puts its rate back in the end. No question is asked again before its answer. Main
 /// thread only.

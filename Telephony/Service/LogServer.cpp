@@ -130,7 +130,7 @@ std::shared_ptr<LocalPort> LogServer::createChannelPort() {
     const auto answer = [this](LocalPort& port, std::int32_t messageId, const Data& payload) {
         return messageId == 0 ? command(port.name(), payload) : std::nullopt;
     };
-    // Numbers are not used again; one that is taken all the same belongs to somebody else.
+    // Numbers are not used again; one that is taken all the same belongs to another process.
     for (int attempt = 0; attempt < 100; ++attempt) {
         const std::string name =
             std::string(vox::serverPortName) + ".channel." + std::to_string(++_channelsMade);

@@ -16,7 +16,7 @@ public:
     virtual ~LogSink() = default;
     /// One log message, exactly as it is to arrive at the application's port.
     virtual void take(const Data& message) = 0;
-    /// False while somebody who is worth waiting for still has much to take. A source that keeps a pace of
+    /// False while a client that is worth waiting for still has much to take. A source that keeps a pace of
     /// its own sends on regardless; one that runs as fast as it can waits.
     [[nodiscard]] virtual bool hasRoom() const = 0;
 };

@@ -42,8 +42,7 @@ bool rename(const std::string& from, const std::filesystem::path& to, FileDraft:
 } // namespace
 
 Result<FileDraft> FileDraft::create(const std::filesystem::path& target, mode_t mode) {
-    // From the moment that there is a file until somebody has the draft nothing here may throw: nobody would
-    // know of the file.
+    // Once the file exists nothing here may throw until the draft owns it: the file would be left over.
     std::string path = target.string() + ".XXXXXX";
     FileDraft draft(target, {}, {});
     draft._file = FileDescriptor(::mkostemp(path.data(), O_CLOEXEC));

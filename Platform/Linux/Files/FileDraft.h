@@ -14,8 +14,8 @@
 namespace velmora {
 
 /// A file in the making: it is written beside the one whose place it takes in the end, in one step, so that a
-/// failure leaves what was there and nobody sees part of it. A draft that is not published is removed.
-/// Reasons are ready to stand behind "file: ".
+/// failure leaves what was there and no part of it is ever visible. A draft that is not published is removed.
+/// Reasons are ready to follow "file: ".
 class FileDraft {
 public:
     enum class WhereThereIsOne { Replace, Refuse };

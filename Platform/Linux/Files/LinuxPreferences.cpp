@@ -116,7 +116,7 @@ void LinuxPreferences::announceChange(std::string_view domain, std::string_view 
                                                  QStringLiteral("com.velmora.Preferences"),
                                                  QStringLiteral("PreferencesChanged"));
         signal << textOf(domain) << textOf(key);
-        // Without a bus there is nobody to tell.
+        // Without a bus there is no one to notify.
         if (!bus.isConnected())
             logLine(LogPriority::Info, "Preferences: no session bus to announce the change on");
         else if (!bus.send(signal))

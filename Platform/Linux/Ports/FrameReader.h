@@ -37,7 +37,7 @@ public:
     static constexpr std::size_t maximumRead = std::size_t{64} << 10;
 
 private:
-    /// Room for `size` bytes behind those that wait.
+    /// Room for `size` bytes after those that have not been taken.
     std::uint8_t* room(std::size_t size);
 
     std::vector<std::uint8_t> _buffer;

@@ -199,7 +199,7 @@ LinuxLocalPort::Served LinuxLocalPort::serve(const Connection& connection, Budge
                 return malformed("a reply, wanted a request or a one-way message");
             --budget.messages;
             deliver(*connection, *frame);
-            // The callback may have closed the port, or nobody but this function may hold it any more.
+            // The callback may have closed the port, or this function may hold the last reference to it.
             if (!isValid() || self.use_count() == 1)
                 return Served::PortGone;
             continue;

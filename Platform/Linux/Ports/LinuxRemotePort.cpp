@@ -77,8 +77,7 @@ Result<std::shared_ptr<LinuxRemotePort>> LinuxRemotePort::connect(const std::str
     ::setsockopt(socket.get(), SOL_SOCKET, SO_SNDTIMEO, &time, sizeof time);
     const PortAddress address = directory->addressOf(name);
     int error = connectTo(address, socket.get());
-    // A socket that nobody listens on is what a crash leaves. A new owner takes it away before it makes its
-    // own.
+    // A socket without a listener is what a crash leaves. A new owner removes it before it makes its own.
     const auto deadline =
         deadlineAfter(error == ECONNREFUSED ? options.restartPatience : SteadyClock::duration::zero());
     while ((error == ECONNREFUSED || error == ENOENT) && SteadyClock::now() < deadline) {
@@ -247,8 +246,8 @@ std::optional<Frame> LinuxRemotePort::takeReply(std::uint32_t serial) {
 void LinuxRemotePort::takeWhatArrived() {
     if (_reader.readFrom(_socket.get()).outcome == FrameReader::Outcome::Ended)
         return connectionEnded();
-    // Outside of sendRequest nobody waits for a reply, and 0 is no request's serial.
-    [[maybe_unused]] const auto nobodys = takeReply(0);
+    // Outside of sendRequest no reply is expected: all are discarded, since 0 is no request's serial.
+    [[maybe_unused]] const auto none = takeReply(0);
 }
 
 void LinuxRemotePort::post(std::int32_t messageId, const Data& payload) {

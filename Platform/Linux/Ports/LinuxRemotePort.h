@@ -17,7 +17,7 @@
 
 namespace velmora {
 
-/// A connection to somebody's local port.
+/// A connection to another process's local port.
 ///
 /// The end of the connection is noticed by the event loop, by `sendRequest`, and by `isValid` itself, which
 /// asks the system. The invalidation callback comes from the event loop when the connection has ended, and
@@ -49,8 +49,8 @@ private:
 
     [[nodiscard]] std::int32_t sendNow(const Frame& frame, Deadline deadline);
     [[nodiscard]] Answer awaitReply(std::uint32_t serial, Deadline deadline);
-    /// The reply with that serial out of what has arrived; others are late ones that nobody waits for. A
-    /// frame that cannot be ends the connection.
+    /// The reply with that serial out of what has arrived; others are late and are discarded. A malformed
+    /// frame ends the connection.
     [[nodiscard]] std::optional<Frame> takeReply(std::uint32_t serial);
     void takeWhatArrived();
     void flushQueue();

@@ -34,8 +34,8 @@ public:
 
     /// Sends the frame when the peer takes it. Never blocks.
     void send(const Frame& frame);
-    /// Whether so much waits for a peer which does not take its replies that no more may be made for it: it
-    /// is not read until it does, so that it can fill nobody's memory but its own.
+    /// Whether so many replies wait for a peer that does not take them that no more may be made: its requests
+    /// are not read until it does, so that it cannot fill this process's memory.
     [[nodiscard]] bool isClogged() const;
 
     /// Set by the port while the connection stands in its list of connections to serve.

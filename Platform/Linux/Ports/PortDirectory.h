@@ -22,7 +22,7 @@ struct PortAddress {
 };
 
 /// The open directory in which the ports' sockets and lock files lie. It belongs to the process's user and
-/// nobody else can write to it.
+/// no other user can write to it.
 class PortDirectory {
 public:
     /// Opens `path`, making it (mode 0700) and what is missing above it. A directory of another user, or one

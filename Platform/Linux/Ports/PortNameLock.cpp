@@ -47,7 +47,7 @@ bool PortNameLock::holds() const {
 }
 
 PortNameLock::~PortNameLock() {
-    // Removed while it is still locked: nobody else can have taken the name.
+    // Removed while it is still locked: no other process can have taken the name.
     if (_lock && holds())
         ::unlinkat(_directory, _file.c_str(), 0);
 }

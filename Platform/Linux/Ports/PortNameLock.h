@@ -24,7 +24,7 @@ public:
     PortNameLock& operator=(PortNameLock&& other) = delete;
     ~PortNameLock();
 
-    /// Whether the lock file is still the one that was locked; false when somebody has removed it, so that
+    /// Whether the lock file is still the one that was locked; false when it has been removed, so that
     /// the name may have another owner by now.
     [[nodiscard]] bool holds() const;
 

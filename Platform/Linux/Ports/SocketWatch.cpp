@@ -13,7 +13,7 @@ class SocketWatch::Impl : public QSocketNotifier {
 public:
     Impl(int descriptor, Type type, std::function<void()> action)
         : QSocketNotifier(descriptor, type), _action(std::move(action)) {
-        // As with timers: what nobody catches ends the program here.
+        // As with timers: an uncaught exception ends the program here.
         connect(this, &QSocketNotifier::activated, this, [this]() noexcept { run(); });
     }
 

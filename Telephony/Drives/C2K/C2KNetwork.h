@@ -9,8 +9,8 @@
 
 namespace velmora {
 
-/// A sector of the CDMA2000 network: its pilot and what it tells of the system. 1x and EV-DO have a carrier
-/// each and share the pilot's offset.
+/// A sector of the CDMA2000 network: its pilot and what it broadcasts about the system. 1x and EV-DO have a
+/// carrier each and share the pilot's offset.
 struct C2KSector {
     int pnOffset = 0;      ///< 0-511, in units of 64 chips
     int baseId = 0;        ///< 16 bits

@@ -108,7 +108,7 @@ RecordBuilder oneXStatus(const OneXStatusReport& report) {
     record.u8(radio + 11, oneXLevel(report.received_dBm[1]));
     record.u16(radio + 12, std::llround(report.sent_dBm * 10));
     addActiveSet(record, report.pilots);
-    subPacket(record, 4, 8); // the fingers, which nobody reads
+    subPacket(record, 4, 8); // the fingers, which no decoder reads
     return record;
 }
 

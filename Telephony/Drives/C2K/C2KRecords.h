@@ -40,7 +40,7 @@ struct EVDOStatusReport {
 
 /// 0x12B6. At most 6 pilots, with what the sector sends against all that is received.
 [[nodiscard]] RecordBuilder evdoActiveSet(const std::vector<C2KPilot>& pilots);
-/// 0x108A: six fingers, of which those behind the pilots are unassigned; none at all for `fingers` of 0.
+/// 0x108A: six fingers, of which those after the pilots are unassigned; none at all for `fingers` of 0.
 [[nodiscard]] RecordBuilder evdoFingers(const std::vector<C2KPilot>& pilots, std::size_t fingers = 6);
 
 struct OneXStatusReport {

@@ -11,7 +11,7 @@
 namespace velmora {
 
 /// A drive through the GSM cells of RadioNetwork, in the IFX technology: once a second the baseband sends its
-/// whole display as one property list, in the binary and the XML form by turns. What an engineer sees in a
+/// whole display as one property list, in the binary and the XML form alternately. What an engineer sees in a
 /// round of two and a half minutes:
 ///
 /// - Searching: neighbours alone. Then a serving cell in limited service, then registration.

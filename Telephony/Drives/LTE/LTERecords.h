@@ -21,7 +21,7 @@ namespace velmora::records {
                                               const std::vector<LTEMeasurement>& neighbours,
                                               const std::vector<LTEMeasurement>& detected);
 
-/// What the network tells of cell selection: levels in dBm, thresholds in dB, all of them even.
+/// The network's parameters of cell selection: levels in dBm, thresholds in dB, all of them even.
 inline constexpr int lteAccessMinimum_dBm = -120;
 inline constexpr int lteMaximumPower_dBm = 23;
 inline constexpr int lteIntraSearch_dB = 46;
@@ -61,8 +61,8 @@ struct ReselectionCandidate {
     int cell = 0; ///< physical cell id, primary scrambling code, BSIC or pilot offset
     int band = 0; ///< of GERAN and CDMA
 };
-/// 0xB186. The candidates' headers stand side by side, and only the last one has room behind it for what
-/// belongs to its technology: a decoder that looks behind an earlier header finds the next candidate's there.
+/// 0xB186. The candidates' headers stand side by side, and only the last one has room after it for what
+/// belongs to its technology: a decoder that looks past an earlier header finds the next candidate's there.
 [[nodiscard]] RecordBuilder reselectionCandidates(const LTECell& serving,
                                                   const std::vector<ReselectionCandidate>& candidates);
 

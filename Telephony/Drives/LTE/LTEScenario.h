@@ -27,7 +27,7 @@ namespace velmora {
 /// unknown technology. Every seventh time three come at once; then each but the last shows as its own channel
 /// and cell the priority and type of the one after it, since that is where the record has them.
 ///
-/// From six to eight messages come a second. The extra stream tells of the SIM, the cells around and the
+/// From six to eight messages come a second. The extra stream reports the SIM, the cells around and the
 /// contexts, as binary and XML property lists in turn. Every ten seconds or so a message is odd (see Damage):
 /// the records of serving cell, idle and connected measurement, neighbours and candidates come too short by
 /// turns, and each of the three counted ones with a count too high.
@@ -57,7 +57,7 @@ private:
     void addReports(DriveScript& due) override;
     [[nodiscard]] DamageMaterial damageMaterial(std::size_t number) override;
 
-    /// Camps on the best cell of the phone's carrier, where there is one, and tells of it.
+    /// Camps on the best cell of the phone's carrier, where there is one, and reports it.
     std::optional<RecordBuilder> camp();
     void sayConnected(double delay, bool connected);
     void sayContexts(double delay, int count);

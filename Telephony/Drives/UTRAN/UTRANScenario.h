@@ -23,11 +23,11 @@ namespace velmora {
 /// - A call: Cell DCH with four transport channels on one composite one, and handovers.
 /// - A packet session with two contexts; then power-off with every list empty, and again from the start.
 ///
-/// About ten messages come a second. The extra stream tells of the SIM, the cells around and the contexts, as
+/// About ten messages come a second. The extra stream reports the SIM, the cells around and the contexts, as
 /// binary and XML property lists in turn. Every ten seconds or so a message is odd (see Damage): the records
-/// of the RRC state and of the serving cell come too short by turns - after the former the state is unknown
-/// until the next report - and each of the three counted records comes with a count too high.
-/// Main thread only.
+/// of the RRC state and of the serving cell come too short alternately - after the former the state is
+/// unknown until the next report - and each of the three counted records comes with a count too high. Main
+/// thread only.
 class UTRANScenario final : public DriveScenario {
 public:
     explicit UTRANScenario(std::uint64_t seed);
