@@ -5,6 +5,7 @@
 #include "Fuzz/DriveMessages.h"
 #include "Fuzz/FuzzMaterials.h"
 #include "Fuzz/MaterialTools.h"
+#include "LogMessages/LogMessage.h"
 
 namespace velmora {
 
@@ -48,8 +49,9 @@ FuzzMaterial dlfMaterial() {
             material.seeds.push_back(behind(static_cast<std::uint8_t>(perRedraw - 1), log->bytes()));
         }
     }
-    for (const std::uint8_t type : std::initializer_list<std::uint8_t>{0x01, 0x81, 0xFF})
-        material.tokens.push_back(behind(type, {}));
+    for (const std::uint8_t begin :
+         {LogMessage::basebandType, LogMessage::prefixMarker, LogMessage::extraType})
+        material.tokens.push_back(behind(begin, {}));
     material.tokens.emplace_back(std::vector<std::uint8_t>{0xA1, 0x00, 0xFD, 0x1F});
     return material;
 }
