@@ -72,9 +72,7 @@ public:
     Screens& operator=(const Screens&) = delete;
 
     void decode(const Data& message) { _decoder->updateState(_state, message); }
-    void look() {
-        collectShown(_decoder->display(_state), "", _shown);
-    }
+    void look() { collectShown(_decoder->display(_state), "", _shown); }
     [[nodiscard]] const std::set<std::string>& shown() const { return _shown; }
 
 private:

@@ -7,9 +7,8 @@
 #include "Platform/Result.h"
 #include "Recording/MessageReader.h"
 
-#include <memory>
-#include <optional>
 #include <cstdint>
+#include <memory>
 #include <optional>
 #include <string>
 #include <string_view>

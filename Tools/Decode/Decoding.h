@@ -37,11 +37,11 @@ public:
     virtual void messageComes(const LoggedMessage&) {}
     /// What gets the effects of each message; asked once. Null for none, which makes decoding faster.
     [[nodiscard]] virtual MessageEffects* effects() { return nullptr; }
-    /// Whether the decoder keeps its history, for what a snapshot saves; asked at the beginning and after each
-    /// refresh. Decoding without is faster.
+    /// Whether the decoder keeps its history, for what a snapshot saves; asked at the beginning and after
+    /// each refresh. Decoding without is faster.
     [[nodiscard]] virtual bool wantsHistory(std::uint64_t /*refreshes*/) const { return false; }
-    /// Whether the display is wanted at each refresh, or only at the last one; asked once. Decoding without is
-    /// faster, since text is made only of what is asked for.
+    /// Whether the display is wanted at each refresh, or only at the last one; asked once. Decoding without
+    /// is faster, since text is made only of what is asked for.
     [[nodiscard]] virtual bool wantsEveryRefresh() const { return true; }
     /// A wanted message has been decoded; `decoder.display(state)` is the display as it then stands.
     virtual void messageDecoded(const LoggedMessage&, LogGenerator& /*decoder*/, Dictionary& /*state*/) {}
