@@ -7,6 +7,7 @@
 #include "Platform/Clock.h"
 #include "Platform/Linux/Files/LinuxFileSystem.h"
 #include "Platform/Linux/Files/LinuxPreferences.h"
+#include "Platform/Linux/MachineClock.h"
 #include "Platform/Linux/Ports/LinuxMessagePorts.h"
 #include "Platform/Linux/Ports/LinuxTelephonyService.h"
 #include "Platform/Linux/QtMainQueue.h"

@@ -24,11 +24,4 @@ public:
     [[nodiscard]] virtual ZoneState zoneAt(Time moment) const = 0;
 };
 
-/// The machine's clock, and the zone that TZ and /etc/localtime name.
-class MachineClock final : public Clock {
-public:
-    [[nodiscard]] Time now() const override;
-    [[nodiscard]] ZoneState zoneAt(Time moment) const override;
-};
-
 } // namespace velmora

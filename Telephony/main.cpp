@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: MIT
 
 #include "Platform/Clock.h"
+#include "Platform/Linux/MachineClock.h"
 #include "Platform/Linux/MainLoop.h"
 #include "Platform/Linux/Ports/LinuxMessagePorts.h"
 #include "Platform/Linux/ProgramLog.h"
@@ -70,7 +71,7 @@ int serve(const Options& options, const velmora::SourceChoice& choice) {
         std::fprintf(stderr, "%s: %s\n", program, source.reason().c_str());
         return badInput;
     }
-    // Before there are sockets that a signal would leave behind.
+    // Before there are sockets that a signal would leave in the file system.
     const SignalWatcher signals([&loop](int number) {
         logFormat(LogPriority::Notice, "stopping on signal %d", number);
         loop.quit(done);

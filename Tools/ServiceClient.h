@@ -4,6 +4,7 @@
 #pragma once
 
 #include "Model/VelmoraModel.h"
+#include "Platform/Linux/MachineClock.h"
 #include "Platform/Linux/MainLoop.h"
 #include "Platform/Linux/Ports/LinuxMessagePorts.h"
 #include "Platform/Linux/Ports/LinuxTelephonyService.h"

@@ -6,6 +6,7 @@
 #include "Model/Snapshot.h"
 #include "Platform/Linux/Errno.h"
 #include "Platform/Linux/Files/Files.h"
+#include "Platform/Linux/MachineClock.h"
 #include "Platform/TelephonyService.h"
 #include "PropertyLists/PropertyList.h"
 #include "Recording/DLF/DLFWriter.h"

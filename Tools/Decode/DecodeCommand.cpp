@@ -3,6 +3,7 @@
 
 #include "Tools/Decode/DecodeCommand.h"
 
+#include "Platform/Linux/MachineClock.h"
 #include "Recording/OpenMessages.h"
 #include "Tools/Decode/CSVRows.h"
 #include "Tools/Decode/DecodeProgress.h"

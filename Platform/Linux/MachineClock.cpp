@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Platform/Clock.h"
+#include "Platform/Linux/MachineClock.h"
 
 #include <ctime>
 
