@@ -21,7 +21,7 @@ using testing::ElementsAre;
 
 /// The lines of a table in the dissector's source.
 std::string tableNamed(const std::string& name) {
-    const Data source = shippedResource("wireshark/velmora.lua");
+    const Data source = shippedResource("wireshark/velmora.lua.in");
     const std::string text(source.bytes().begin(), source.bytes().end());
     const std::string head = "local " + name + " = {\n";
     const std::size_t begin = text.find(head);
