@@ -45,6 +45,25 @@ function(velmora_library name)
     target_link_libraries(${name} PUBLIC velmora_options ${arg_LINK})
 endfunction()
 
+# velmora_generate_from_sections(OUTPUT TABLE [TEMPLATE file]): a file that list-sections (in Tools/ListSections) prints,
+# again whenever a section changes. A file that comes out the same is left alone, so that nothing that uses it is built
+# again. The program has to run on the machine that builds: set CMAKE_CROSSCOMPILING_EMULATOR to build for another kind.
+function(velmora_generate_from_sections output table)
+    cmake_parse_arguments(PARSE_ARGV 2 arg "" "TEMPLATE" "")
+    set(input)
+    if(arg_TEMPLATE)
+        set(input < ${arg_TEMPLATE})
+    endif()
+    cmake_path(GET output FILENAME name)
+    set(printed ${CMAKE_BINARY_DIR}/generated/${name}.new)
+    file(MAKE_DIRECTORY ${CMAKE_BINARY_DIR}/generated)
+    add_custom_command(OUTPUT ${output} BYPRODUCTS ${printed}
+                       COMMAND list-sections ${table} ${input} > ${printed}
+                       COMMAND ${CMAKE_COMMAND} -E copy_if_different ${printed} ${output}
+                       DEPENDS list-sections ${arg_TEMPLATE}
+                       COMMENT "Generating ${name} from the sections" VERBATIM)
+endfunction()
+
 # velmora_compile_quickly(NAME): for what is run a few times at most; optimizing it takes longer than it saves.
 function(velmora_compile_quickly name)
     target_compile_options(${name} PRIVATE "$<$<CONFIG:Release,RelWithDebInfo>:-O1;-g1>")

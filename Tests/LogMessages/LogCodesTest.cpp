@@ -3,14 +3,13 @@
 
 #include "LogMessages/LogCodes.h"
 
-#include "LogGenerator/LogGenerator.h"
 #include "Platform/TelephonyService.h"
-#include "Tests/Support/FakeClock.h"
-#include "Tests/Support/FakeResources.h"
 
+#include <algorithm>
 #include <cstdint>
 #include <set>
-#include <string>
+#include <span>
+#include <string_view>
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
@@ -18,34 +17,49 @@
 namespace velmora {
 namespace {
 
-/// The codes that the technology's decoder asks the telephony service for.
-std::set<std::uint32_t> wantedCodes(std::string_view technology) {
-    const FakeClock clock;
-    FakeResources resources; // in which UTRAN's template is looked for by its name
-    resources.put("Ostrel_UTRAN", "plist", makeDictionary());
-    const auto decoder = LogGenerator::generatorFromTechnology(technologyConstant(technology), clock);
-    const DictionaryRef command = decoder->getStartCommand();
-    std::set<std::uint32_t> codes;
-    if (const Array* list = (*command)[vox::setOstrelLogCodesKey].asArray())
-        for (const Value& code : *list)
-            codes.insert(static_cast<std::uint32_t>(*code.asInteger()));
-    if (const Array* list = (*command)[vox::setVoxExtraCodesKey].asArray())
-        for (const Value& code : *list)
-            codes.insert(0xFF0000 + static_cast<std::uint32_t>(*code.asInteger()));
-    return codes;
+using testing::AllOf;
+using testing::Ge;
+using testing::IsEmpty;
+using testing::Lt;
+using testing::UnorderedElementsAre;
+
+/// The technologies whose decoders want the code.
+std::set<std::string_view> wanting(std::uint32_t code) {
+    std::set<std::string_view> names;
+    for (unsigned bit = 0; bit < technologyBits; ++bit)
+        if (technologiesOfCode(code) >> bit & 1)
+            names.insert(technologyOfBit(bit));
+    return names;
 }
 
-TEST(LogCodesTest, areThoseThatTheDecodersWant) {
-    for (unsigned bit = 0; bit < technologyBits; ++bit) {
-        const std::set<std::uint32_t> wanted = wantedCodes(technologyOfBit(bit));
-        EXPECT_GE(wanted.size(), 8u);
-        for (std::uint32_t code = 0; code <= 0xFFFFFF; ++code) {
-            if (code == 0x10000)
-                code = 0xFF0000; // no code lies between
-            ASSERT_EQ((technologiesOfCode(code) >> bit & 1) != 0, wanted.contains(code))
-                << technologyOfBit(bit) << " 0x" << std::hex << code;
-        }
-    }
+TEST(LogCodesTest, belongToTheTechnologyOfTheirSections) {
+    EXPECT_THAT(wanting(0x5137), UnorderedElementsAre("Ostrel_GSM"));
+    EXPECT_THAT(wanting(0x4005), UnorderedElementsAre("Ostrel_GSM"));
+    EXPECT_THAT(wanting(0x134F), UnorderedElementsAre("Ostrel_CDMA"));
+    EXPECT_THAT(wanting(0xB0C1), UnorderedElementsAre("Ostrel_LTE"));
+    EXPECT_THAT(wanting(0xB186), UnorderedElementsAre("Ostrel_LTE"));
+    EXPECT_THAT(wanting(0xD00A), UnorderedElementsAre("Ostrel_UTRAN2"));
+    EXPECT_THAT(wanting(0xD0E2), UnorderedElementsAre("Ostrel_UTRAN2"));
+}
+
+TEST(LogCodesTest, belongToAllTechnologiesWithSectionsInTheExtraStream) {
+    for (const std::uint32_t code : {0xFF0000u, 0xFF0001u, 0xFF0002u})
+        EXPECT_THAT(wanting(code), UnorderedElementsAre("Ostrel_GSM", "Ostrel_LTE", "Ostrel_UTRAN2"));
+}
+
+TEST(LogCodesTest, belongToNoneWhereNoDecoderWantsThem) {
+    EXPECT_THAT(wanting(0x108A), UnorderedElementsAre("Ostrel_CDMA")); // the lowest code
+    for (const std::uint32_t code :
+         {0u, 1u, 0x1089u, 0x108Bu, 0x1375u, 0xFFFFu, 0x10000u, 0x1005137u, 0xFF0003u})
+        EXPECT_THAT(wanting(code), IsEmpty()) << code;
+}
+
+TEST(LogCodesTest, areListedOnceInAscendingOrder) {
+    const std::span<const LogCodeRow> rows = logCodeRows();
+    const auto notAbove = [](const LogCodeRow& a, const LogCodeRow& b) { return a.code >= b.code; };
+    EXPECT_EQ(std::ranges::adjacent_find(rows, notAbove), rows.end());
+    for (const LogCodeRow& row : rows)
+        EXPECT_THAT(row.technologies, AllOf(Ge(1), Lt(1 << technologyBits))) << row.code;
 }
 
 TEST(LogCodesTest, knowEveryBinaryTechnology) {

@@ -15,9 +15,8 @@ namespace velmora {
 
 std::vector<std::string> dissected(const std::string& path, const std::string& options) {
     const ShellOutcome outcome =
-        runShell("LC_ALL=C TZ=UTC tshark -X lua_script:" +
-                 shellQuoted(VELMORA_SOURCE_DIR "/Resources/wireshark/velmora.lua") + " -r " +
-                 shellQuoted(path) + " " + options + " 2>&1 | grep -v '^Running as user'");
+        runShell("LC_ALL=C TZ=UTC tshark -X lua_script:" + shellQuoted(VELMORA_BUILD_DIR "/velmora.lua") +
+                 " -r " + shellQuoted(path) + " " + options + " 2>&1 | grep -v '^Running as user'");
     EXPECT_EQ(outcome.output.find("Lua"), std::string::npos) << outcome.output;
     std::istringstream text(outcome.output);
     std::vector<std::string> lines;

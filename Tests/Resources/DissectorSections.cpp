@@ -11,10 +11,8 @@
 #include "Tests/Support/FakeClock.h"
 
 #include <algorithm>
-#include <cstdio>
 #include <map>
 #include <memory>
-#include <set>
 
 namespace velmora {
 
@@ -60,12 +58,6 @@ const ClassIndex* indexOf(std::string_view technology) {
     return decoders.indexOf(technology);
 }
 
-std::string keyOf(std::uint32_t code) {
-    char key[32];
-    std::snprintf(key, sizeof key, "[0x%04X] = ", static_cast<unsigned>(code));
-    return key;
-}
-
 } // namespace
 
 std::vector<std::string> recordTechnologies() {
@@ -90,40 +82,6 @@ std::vector<std::string> sectionsWanting(std::string_view technology, std::uint3
 std::string recordName(std::uint32_t code) {
     const C2K::LogCodeParser* parser = C2K::parserOfCode(code);
     return parser ? std::string(parser->name()) : "";
-}
-
-std::string dissectorRecords() {
-    std::map<std::uint32_t, std::string> names;
-    for (const C2K::LogCodeParser* parser : C2K::logCodeParsers())
-        names[parser->logCode()] = parser->name();
-    std::string table;
-    for (const auto& [code, name] : names)
-        table += "    " + keyOf(code) + '"' + name + "\",\n";
-    return table;
-}
-
-std::string dissectorSections() {
-    std::string order;
-    std::string tables;
-    for (const std::string& technology : recordTechnologies()) {
-        order += (order.empty() ? "\"" : ", \"") + technology + "\"";
-        std::set<std::uint32_t> codes;
-        if (const ClassIndex* index = indexOf(technology))
-            for (const std::string& code : index->getAllLogCodes())
-                codes.insert(static_cast<std::uint32_t>(std::stoul(code)));
-        tables += "    " + technology + " = {\n";
-        for (const std::uint32_t code : codes) {
-            tables += "        " + keyOf(code) + "{";
-            bool first = true;
-            for (const std::string& name : sectionsWanting(technology, code)) {
-                tables += (first ? "\"" : ", \"") + name + "\"";
-                first = false;
-            }
-            tables += "},\n";
-        }
-        tables += "    },\n";
-    }
-    return "    order = {" + order + "},\n" + tables;
 }
 
 } // namespace velmora

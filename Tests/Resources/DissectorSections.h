@@ -10,7 +10,7 @@
 
 namespace velmora {
 
-/// The technologies whose messages are records, by their short names, in the order of the dissector's table.
+/// The technologies whose messages are records, by their short names.
 [[nodiscard]] std::vector<std::string> recordTechnologies();
 
 /// The sections of a technology's decoder that want a log code, each once, in calling order; none where the
@@ -20,10 +20,5 @@ namespace velmora {
 /// What a record of the technology without sections is called; empty where its decoder does not know the
 /// code.
 [[nodiscard]] std::string recordName(std::uint32_t code);
-
-/// The dissector's tables of log codes, with sections and with names of records, as they have to be, line by
-/// line.
-[[nodiscard]] std::string dissectorSections();
-[[nodiscard]] std::string dissectorRecords();
 
 } // namespace velmora

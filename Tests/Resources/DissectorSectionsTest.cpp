@@ -1,43 +1,20 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Tests/Resources/DissectorSections.h"
-
 #include "Tests/Recording/PcapngFile.h"
 #include "Tests/Resources/Dissection.h"
 #include "Tests/Support/ShellCommand.h"
-#include "Tests/Support/ShippedResources.h"
 #include "Tests/Support/TemporaryDirectory.h"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
-/// The dissector's table of log codes and sections against the decoders.
+/// Which sections the dissector names, and what it calls records.
 
 namespace velmora {
 namespace {
 
 using testing::ElementsAre;
-
-/// The lines of a table in the dissector's source.
-std::string tableNamed(const std::string& name) {
-    const Data source = shippedResource("wireshark/velmora.lua");
-    const std::string text(source.bytes().begin(), source.bytes().end());
-    const std::string head = "local " + name + " = {\n";
-    const std::size_t begin = text.find(head);
-    if (begin == std::string::npos)
-        return "no table " + name;
-    const std::size_t from = begin + head.size();
-    return text.substr(from, text.find("\n}\n", from) + 1 - from);
-}
-
-TEST(DissectorSections, areThoseOfTheDecoders) {
-    EXPECT_EQ(tableNamed("sections"), dissectorSections()) << "it has to be:\n" << dissectorSections();
-}
-
-TEST(DissectorSections, orRecordsAreThoseOfTheDecoderWithoutSections) {
-    EXPECT_EQ(tableNamed("records"), dissectorRecords()) << "it has to be:\n" << dissectorRecords();
-}
 
 TEST(DissectorSections, followTheNameOfTheInterface) {
     NEEDS_PROGRAM("tshark");
@@ -60,6 +37,24 @@ TEST(DissectorSections, followTheNameOfTheInterface) {
     // Without a technology's name those of all, each name once.
     EXPECT_THAT(sections(""), ElementsAre(gsm, lte, "SIM Info"));
     EXPECT_THAT(sections("eth0"), ElementsAre(gsm, lte, "SIM Info"));
+}
+
+TEST(DissectorSections, giveWayToNamesOfRecordsInCDMA) {
+    NEEDS_PROGRAM("tshark");
+    const TemporaryDirectory directory;
+    const std::string path = directory / "a.pcapng";
+    const Data messages[] = {
+        record(0x108A, ""), // the lowest of CDMA's codes
+        record(0x134F, ""), // the highest
+        record(0x5137, "")  // GSM's alone
+    };
+    const auto names = [&](std::string_view technology) {
+        writeCapture(path, technology, messages);
+        return dissectedFields(path, {"velmora.record"});
+    };
+    EXPECT_THAT(names("Ostrel_CDMA"), ElementsAre("Finger C/I", "System identification", ""));
+    EXPECT_THAT(names(""), ElementsAre("Finger C/I", "System identification", ""));
+    EXPECT_THAT(names("Ostrel_GSM"), ElementsAre("", "", ""));
 }
 
 } // namespace

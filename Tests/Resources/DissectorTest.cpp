@@ -261,8 +261,7 @@ TEST_F(Dissector, servesDisplayFilters) {
 TEST_F(Dissector, isLoadedFromTheDirectoryOfLuaPlugins) {
     const std::filesystem::path plugins = _directory / ".local/lib/wireshark/plugins";
     std::filesystem::create_directories(plugins);
-    std::filesystem::copy_file(VELMORA_SOURCE_DIR "/Resources/wireshark/velmora.lua",
-                               plugins / "velmora.lua");
+    std::filesystem::copy_file(VELMORA_BUILD_DIR "/velmora.lua", plugins / "velmora.lua");
     const ShellOutcome outcome =
         runShell("HOME=" + shellQuoted(_directory.path()) + " tshark -r " +
                  capture({hex("01 0C00 2C51 0000000000000000")}) + " -T fields -e velmora.code");

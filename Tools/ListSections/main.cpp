@@ -1,0 +1,140 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
+#include "Platform/Console.h"
+#include "Tools/ListSections/TechnologyTable.h"
+
+#include <cstdio>
+#include <iomanip>
+#include <iostream>
+#include <sstream>
+#include <string>
+#include <string_view>
+
+/// The program list-sections, which the build runs: it prints what the source tree needs to know of the
+/// sections outside their decoders.
+
+namespace velmora {
+namespace {
+
+using Tables = std::vector<TechnologyTable>;
+
+std::string codeText(std::uint32_t code) {
+    char text[16];
+    std::snprintf(text, sizeof text, "0x%04X", static_cast<unsigned>(code));
+    return text;
+}
+
+/// The source of the library velmora_log_codes (see LogMessages/LogCodes.h).
+std::string logCodesSource(const Tables& tables) {
+    std::ostringstream text;
+    std::map<std::uint32_t, unsigned> technologies; // a bit each, by log code
+    text << "// Generated from the decoders' sections by list-sections.\n\n"
+            "#include \"LogMessages/LogCodes.h\"\n\n"
+            "namespace velmora {\n\n"
+            "std::string_view technologyOfBit(unsigned bit) {\n"
+            "    constexpr std::string_view names[technologyBits] = {\n";
+    for (unsigned bit = 1; const TechnologyTable& table : tables) {
+        text << "        " << std::quoted(table.name) << ",\n";
+        for (const auto& [code, names] : table.sections)
+            technologies[code] |= bit;
+        for (const auto& [code, name] : table.records)
+            technologies[code] |= bit;
+        bit <<= 1;
+    }
+    text << "    };\n"
+            "    return names[bit];\n"
+            "}\n\n"
+            "std::span<const LogCodeRow> logCodeRows() {\n"
+            "    static constexpr LogCodeRow rows[] = {\n";
+    for (const auto& [code, bits] : technologies)
+        text << "        {" << codeText(code) << ", " << bits << "},\n";
+    text << "    };\n"
+            "    return rows;\n"
+            "}\n\n"
+            "} // namespace velmora\n";
+    return text.str();
+}
+
+/// The fields of the Lua table that gives the sections by technology and log code.
+std::string dissectorSections(const Tables& tables) {
+    std::ostringstream text;
+    text << "    order = {";
+    for (const char* separator = ""; const TechnologyTable& table : tables) {
+        text << separator << std::quoted(table.name);
+        separator = ", ";
+    }
+    text << "},\n";
+    for (const TechnologyTable& table : tables) {
+        text << "    " << table.name << " = {\n";
+        for (const auto& [code, names] : table.sections) {
+            text << "        [" << codeText(code) << "] = {";
+            for (const char* separator = ""; const std::string& name : names) {
+                text << separator << std::quoted(name);
+                separator = ", ";
+            }
+            text << "},\n";
+        }
+        text << "    },\n";
+    }
+    return text.str();
+}
+
+/// The fields of the Lua table that gives the names of records by log code.
+std::string dissectorRecords(const Tables& tables) {
+    std::ostringstream text;
+    for (const TechnologyTable& table : tables)
+        for (const auto& [code, name] : table.records)
+            text << "    [" << codeText(code) << "] = " << std::quoted(name) << ",\n";
+    return text.str();
+}
+
+/// Copies the dissector's template, with the tables in place of the lines that name them. Whether each was
+/// named once.
+bool writeDissector(const Tables& tables, std::istream& source, std::ostream& dissector) {
+    int sections = 0;
+    int records = 0;
+    for (std::string line; std::getline(source, line);) {
+        if (line == "@SECTIONS@") {
+            ++sections;
+            dissector << dissectorSections(tables);
+        } else if (line == "@RECORDS@") {
+            ++records;
+            dissector << dissectorRecords(tables);
+        } else {
+            dissector << line << '\n';
+        }
+    }
+    return sections == 1 && records == 1;
+}
+
+int run(std::string_view what) {
+    const Tables tables = technologyTables();
+    if (what == "log-codes") {
+        std::cout << logCodesSource(tables);
+    } else if (!writeDissector(tables, std::cin, std::cout)) {
+        std::cerr << "list-sections: the template has to have one line @SECTIONS@ and one @RECORDS@\n";
+        return 1;
+    }
+    if (!std::cout.flush()) {
+        std::cerr << "list-sections: standard output cannot be written\n";
+        return 1;
+    }
+    return 0;
+}
+
+} // namespace
+} // namespace velmora
+
+int main(int argc, char* argv[]) {
+    const std::string_view what = argc == 2 ? argv[1] : "";
+    if (what != "log-codes" && what != "dissector") {
+        std::cerr << "usage: list-sections log-codes\n"
+                     "       list-sections dissector <TEMPLATE\n";
+        return 2;
+    }
+    // Class indexes print lines when they are destroyed; standard output is for the tables.
+    if (std::FILE* const nowhere = std::fopen("/dev/null", "w"))
+        velmora::redirectConsole(nowhere);
+    return velmora::run(what);
+}
