@@ -9,9 +9,9 @@
 
 namespace velmora {
 
-/// Writes moments in local time after a pattern: yyyy, MM, dd, HH, mm and ss stand for year, month, day,
-/// hour, minute and second with leading zeros; text between apostrophes, and whatever is no letter, stands
-/// for itself, and two apostrophes for one. A field of another name stands for itself too.
+/// Formats times in local time by a pattern: yyyy, MM, dd, HH, mm and ss stand for year, month, day, hour,
+/// minute and second with leading zeros; text between apostrophes, and whatever is no letter, stands for
+/// itself, and two apostrophes for one. A field of another name stands for itself too.
 class DateFormatter {
 public:
     /// `clock` gives the zone and must outlive the formatter.

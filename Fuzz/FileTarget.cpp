@@ -107,8 +107,8 @@ private:
                     "a loss lies in its file");
     }
 
-    /// The message as it stands at the place that its offset names, or behind it. A record of a DLF log gets
-    /// back the byte that it was written without.
+    /// The message as it is at its offset, or after it. A record of a DLF log gets back the byte that it was
+    /// written without.
     static Bytes contentIn(Bytes message, Bytes place) {
         const auto begins = [place](Bytes content) {
             return content.size() <= place.size() &&

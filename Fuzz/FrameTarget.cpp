@@ -13,7 +13,7 @@ namespace {
 
 /// What a reader gave for a stream.
 struct Taken {
-    std::vector<std::uint8_t> frames; ///< encoded again, one behind the other
+    std::vector<std::uint8_t> frames; ///< encoded again, one after another
     std::string failure;
 };
 

@@ -7,8 +7,8 @@
 
 #include <string_view>
 
-/// What each target's fuzzer starts from. It is all made of the scenarios and the resources, so that none of
-/// it is stored.
+/// The seed corpora of the targets. They are generated from the scenarios and the resources, so that none is
+/// stored.
 
 namespace velmora {
 

@@ -10,7 +10,7 @@
 #include <string_view>
 #include <vector>
 
-/// What the makers of fuzzing material share.
+/// Helpers for making seed corpora.
 
 namespace velmora {
 

@@ -8,7 +8,7 @@
 
 namespace velmora {
 
-/// The binary log technologies, of which sets are made, one bit each.
+/// The binary log technologies as sets, one bit each.
 inline constexpr unsigned technologyBits = 4;
 
 /// The technologies whose decoders want a log code (see LogMessage::logCode), as a set. This room may not

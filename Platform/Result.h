@@ -16,7 +16,7 @@ struct Failure {
 };
 
 /// The outcome of something that can fail for reasons outside the program: a value, or one reason. Test it
-/// before use; reading the value of a failure is an error of the caller's and throws std::bad_variant_access.
+/// before use; reading the value of a failure is a programming error and throws std::bad_variant_access.
 template <class T>
 class [[nodiscard]] Result {
 public:
@@ -37,7 +37,7 @@ private:
     std::variant<T, Failure> _outcome;
 };
 
-/// The value of a result that carries nothing but success.
+/// The value of a result without a value.
 struct Done {};
 
 } // namespace velmora

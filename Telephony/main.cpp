@@ -70,7 +70,7 @@ int serve(const Options& options, const velmora::SourceChoice& choice) {
         std::fprintf(stderr, "%s: %s\n", program, source.reason().c_str());
         return badInput;
     }
-    // Before there are sockets that a signal would leave behind.
+    // Before there are sockets that a signal would leave in place.
     const SignalWatcher signals([&loop](int number) {
         logFormat(LogPriority::Notice, "stopping on signal %d", number);
         loop.quit(done);

@@ -16,12 +16,12 @@
 
 namespace velmora {
 
-/// What the user asked for.
+/// The parsed command line.
 struct CommandLine {
     /// The program prints a text and ends: help, its version, a usage error.
     struct Words {
         int status; ///< exit status; a usage error goes to standard error, the others to standard output
-        std::string text; ///< whole lines
+        std::string text; ///< complete lines
     };
 
     LogKind log = LogKind::Stderr;

@@ -39,7 +39,7 @@ public:
     HeldLog();
     ~HeldLog() override;
     void write(int priority, std::string_view text) override;
-    /// Passes the lines on now.
+    /// Writes the deferred lines now.
     void release();
 
 private:

@@ -13,7 +13,7 @@ namespace velmora {
 /// Writes a message to standard error: "velmora-log: " and the text, in one write.
 void report(std::string_view text);
 
-/// How messages call a file: "standard input" for "-".
+/// A file's name in messages: "standard input" for "-".
 [[nodiscard]] std::string fileTitle(const std::string& path);
 
 /// The message of a command that refuses to overwrite a file.

@@ -18,9 +18,9 @@ public:
     /// `address` is the absolute path of a socket, "@" and the name of an abstract one, or empty for none.
     explicit ServiceManager(std::string address);
 
-    /// The program serves from now on; `status` is one line for who asks how it is.
+    /// The program is ready; `status` is one line for status queries.
     void ready(std::string_view status) const;
-    /// The program is about to end, as it was asked to.
+    /// The program is about to end, as requested.
     void stopping() const;
 
 private:

@@ -66,7 +66,7 @@ DLFWriter::DLFWriter(std::unique_ptr<RecordingFile> file, std::string name)
 
 DLFWriter::~DLFWriter() {
     const Result<Done> closed = close();
-    static_cast<void>(closed); // whoever wants to know has closed it before
+    static_cast<void>(closed); // callers that need the result call close themselves
 }
 
 Result<Done> DLFWriter::append(Bytes message) {

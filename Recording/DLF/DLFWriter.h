@@ -28,7 +28,7 @@ namespace velmora {
 class DLFWriter {
 public:
     /// Creates the file, or empties it; "-" is standard output, which stays open afterwards. The version
-    /// report, with the clock's time and what the resources say of this program, is written at once.
+    /// report, with the clock's time and this program's version from the resources, is written immediately.
     static Result<std::unique_ptr<DLFWriter>> create(const std::string& path, const Clock& clock);
     /// Writes to an open descriptor, which it takes over; failures name it `name`.
     static Result<std::unique_ptr<DLFWriter>> adopt(int descriptor, std::string name, const Clock& clock);

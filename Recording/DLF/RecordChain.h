@@ -36,8 +36,8 @@ public:
 
     struct Record {
         Data message;
-        std::uint64_t offset = 0;    ///< where in the input it begins
-        std::uint64_t timestamp = 0; ///< as it stands in the record (see RecordTime.h)
+        std::uint64_t offset = 0;    ///< its offset in the input
+        std::uint64_t timestamp = 0; ///< unchanged from the record (see RecordTime.h)
         bool isVersionReport = false;
     };
 

@@ -44,8 +44,8 @@ protected:
     void loseRecord(std::uint64_t bytes, std::string reason);
     /// Counts a record that is not part of a chain.
     void countRecord() { ++_number; }
-    /// The time that the record's stamp means; for a stamp of 0, and for one that means none, that of the
-    /// last record with a good one.
+    /// The time of the record's stamp; for a stamp of 0 or an invalid one, that of the last record with a
+    /// valid one.
     [[nodiscard]] Time timeOf(const RecordChain::Record& record);
 
 private:

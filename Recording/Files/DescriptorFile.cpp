@@ -80,7 +80,7 @@ std::optional<int> DescriptorFile::takeSyncOutcome() {
 int DescriptorFile::sync() {
     const int earlier = _syncing.valid() ? _syncing.get() : 0;
     const int now = syncDescriptor(_descriptor);
-    // An error is told once, to whoever asks first.
+    // An error is returned once, to the first caller.
     return earlier != 0 ? earlier : now;
 }
 

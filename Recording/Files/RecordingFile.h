@@ -11,7 +11,7 @@
 
 namespace velmora {
 
-/// What a recording is written to: a file, a pipe, a test's memory. Errors are errno values, 0 being none.
+/// The destination of a recording: a file, a pipe, a test's memory. Errors are errno values, 0 being none.
 /// Main thread only.
 class RecordingFile {
 public:

@@ -145,7 +145,7 @@ bool BlockReader::standsAtBlock() {
     const Bytes header = _input.available();
     const std::uint32_t type = FieldReader(header, _bigEndian).u32(0);
     Block block;
-    // The cheap tests come first: this is asked at every word of what may be a long stretch.
+    // The cheap tests come first: this is called for every word of what may be much input.
     if (leastLength(type) > maximumBlockSize)
         return false;
     if (type != SectionHeader && FieldReader(header, _bigEndian).u32(4) < leastLength(type))

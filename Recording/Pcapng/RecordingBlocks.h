@@ -18,8 +18,8 @@ namespace velmora::recordingBlocks {
 /// Adds the section header and the interface description. Precondition: `technology` has at most 65535 bytes.
 void appendHead(std::vector<std::uint8_t>& buffer, std::string_view technology);
 
-/// Adds a message's block. A moment before 1970 cannot be written and is taken for its beginning.
-/// Precondition: the message is not above `maximumMessageSize`.
+/// Adds a message's block. A time before 1970 cannot be written and becomes 1970-01-01. Precondition: the
+/// message is not above `maximumMessageSize`.
 void appendPacket(std::vector<std::uint8_t>& buffer, Time time, Bytes message);
 
 /// The length of a message's block.

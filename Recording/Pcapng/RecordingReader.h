@@ -23,14 +23,14 @@ namespace velmora {
 /// sections and interfaces, any time resolution, all three kinds of packet blocks; other blocks are skipped.
 /// An interface's name is its technology. The first one named is the recording's; messages of interfaces
 /// without a name belong to it as well, those of another technology are losses. Interfaces of other link
-/// types are counted and otherwise left alone.
+/// types are counted and otherwise ignored.
 ///
 /// Where a block is damaged, reading resumes at the next block that is not. Memory is bounded whatever the
 /// file holds; a message is a window on the reader's chunk and keeps that alive: copy messages that are kept
 /// for long. A message's number is the packet's place in the file, as capture tools count. Main thread only.
 class RecordingReader final : public MessageReader {
 public:
-    /// What was passed over because it is none of ours.
+    /// What was skipped because it is not a log message.
     struct PassedOver {
         std::uint64_t interfaces = 0; ///< of another link type
         std::uint64_t packets = 0;    ///< on such interfaces
@@ -71,18 +71,18 @@ private:
     [[nodiscard]] const Block* nextBlock();
     void takeIn(const Block& block);
     void takeInInterface(const Block& block);
-    /// Makes the message of a packet, unless it is none of ours or lost.
+    /// Reads a packet's message, unless the packet is ignored or a loss.
     void takeMessage(const Block& block, std::optional<LoggedMessage>& message);
     [[nodiscard]] Packet packetOf(const Block& block) const;
     [[nodiscard]] std::string whyUnusable(const Packet& packet, const Block& block) const;
     void lose(const Block& block, std::uint64_t number, std::string reason);
 
     BlockReader _blocks;
-    const Block* _waiting = nullptr;    ///< the packet that `open` came upon
+    const Block* _waiting = nullptr;    ///< the packet that `open` stopped at
     std::vector<Interface> _interfaces; ///< of the present section
-    bool _foundInterface = false;       ///< an interface of log messages has been met
+    bool _foundInterface = false;       ///< an interface of log messages has been read
     std::string _technology;
-    std::uint64_t _packets = 0; ///< packet blocks met
+    std::uint64_t _packets = 0; ///< packet blocks read
     Time _lastTime{};
     PassedOver _passedOver;
 };

@@ -64,7 +64,7 @@ RecordingWriter::RecordingWriter(std::unique_ptr<RecordingFile> file, std::strin
 
 RecordingWriter::~RecordingWriter() {
     const Result<Done> closed = close();
-    static_cast<void>(closed); // whoever wants to know has closed it before
+    static_cast<void>(closed); // callers that need the result call close themselves
 }
 
 Result<Done> RecordingWriter::append(Time time, Bytes message) {

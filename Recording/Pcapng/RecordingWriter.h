@@ -54,11 +54,10 @@ public:
     RecordingWriter(const RecordingWriter&) = delete;
     RecordingWriter& operator=(const RecordingWriter&) = delete;
 
-    /// Adds a message as it arrived. A moment before 1970 cannot be recorded and is taken for its beginning.
-    /// A message above 16 MiB is refused, which does not end the recording. Precondition: it has not been
-    /// closed.
+    /// Adds a message as it arrived. A time before 1970 cannot be recorded and becomes 1970-01-01. A message
+    /// above 16 MiB is refused, which does not end the recording. Precondition: it has not been closed.
     Result<Done> append(Time time, Bytes message);
-    /// Hands all messages so far to the system.
+    /// Writes all messages so far to the file.
     Result<Done> flush();
     /// Flushes, and starts to sync the file in the background: a later call returns the result.
     Result<Done> sync();
@@ -92,15 +91,15 @@ private:
     /// Makes the error a temporary failure where it may pass, else the permanent one.
     void noteFailure(const char* operation, int error);
     [[nodiscard]] Failure failureOf(const char* operation, int error) const;
-    /// Drops so much of the buffer's front.
+    /// Removes the first `length` bytes of the buffer.
     void forget(std::size_t length);
 
     std::unique_ptr<RecordingFile> _file; ///< null when closed
     std::string _name;
-    std::vector<std::uint8_t> _buffer; ///< whole blocks: those kept, then those not yet in the file
+    std::vector<std::uint8_t> _buffer; ///< complete blocks: unsynced ones, then those not yet in the file
     std::uint64_t _base = 0;           ///< where in the file the buffer begins
     std::uint64_t _end = 0;            ///< how long the file is
-    std::uint64_t _syncing = 0;        ///< how long it was when the sync under way began
+    std::uint64_t _syncing = 0;        ///< its length when the sync in progress was started
     std::uint64_t _synced = 0;         ///< how much of it has been synced
     bool _syncIsUnderWay = false;
     bool _keeps = false; ///< `sync` is in use

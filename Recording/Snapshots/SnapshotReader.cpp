@@ -164,7 +164,7 @@ void SnapshotReader::openObject(const Value& object) {
     }
 }
 
-/// The next message of the entry at hand; the last one waits until it is known to be that.
+/// The next message of the current entry; the last one waits until it is known to be that.
 std::optional<LoggedMessage> SnapshotReader::nextOfEntry() {
     while (_records) {
         std::optional<RecordChain::Record> record = nextRecord(*_records, place());

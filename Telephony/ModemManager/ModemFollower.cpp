@@ -89,7 +89,7 @@ void ModemFollower::serviceVanished() {
 
 void ModemFollower::busLost() {
     _faults.tell(presence, "the system bus has gone");
-    // Not at once: this comes from the bus itself.
+    // Deferred: this is called by the bus itself.
     _queue.async([this, weak = std::weak_ptr<bool>(_alive)] {
         if (weak.expired())
             return;

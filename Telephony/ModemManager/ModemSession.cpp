@@ -114,7 +114,7 @@ void ModemSession::askPlace(Dictionaries cells) {
 
 void ModemSession::endTurn(const Dictionaries& cells) {
     after(cellInterval, [this] { turn(); });
-    // An empty list is told once: it empties what is shown.
+    // An empty list is reported once: it clears the display.
     if (std::exchange(_cellsTold, !cells.empty()) || !cells.empty())
         _reports.cells(cells);
 }
@@ -258,7 +258,7 @@ void ModemSession::report() {
         reportContexts(*modem);
 }
 
-// What waits for an answer is not told in halves.
+// Parts that wait for an answer are reported together.
 
 void ModemSession::reportFiles(const Modem& modem) {
     static const Dictionary unread;

@@ -24,38 +24,39 @@ namespace velmora {
 /// thread only.
 class ModemSession {
 public:
-    /// Where what it learns goes. Files and contexts are told when they have changed, cells as often as they
-    /// are measured.
+    /// The receivers of its reports. Files and contexts are reported when they have changed, cells at every
+    /// measurement.
     struct Reports {
         std::function<void(const Dictionaries&)> cells;
         std::function<void(const DictionaryRef&)> simFiles;
         std::function<void(const Dictionaries&)> contexts;
     };
 
-    /// From one answer about the cells to the next question.
+    /// The delay between the answer to a cell query and the next query.
     static constexpr std::chrono::seconds cellInterval{3};
-    /// A question that the modem or the bus refuses is asked again after so many turns of that interval: a
-    /// minute. Whoever sits in front of it may have changed something.
+    /// A refused query is retried after this many intervals, a minute: permissions may have changed
+    /// meanwhile.
     static constexpr int turnsAfterRefusal = 20;
-    /// Cells take a modem on a serial line a while.
+    /// The time-out of a cell query, which is slow on a serial line.
     static constexpr std::chrono::seconds cellTimeout{30};
     /// The rate, in seconds, at which ModemManager is to poll the levels.
     static constexpr std::uint32_t signalRate = 5;
-    /// Changes that come one after the other are told together.
+    /// The delay that combines changes in quick succession into one report.
     static constexpr std::chrono::milliseconds settling{100};
 
-    /// Begins to ask on the queue, not at once. All must outlive it. Precondition: the follower has a modem.
+    /// Starts querying from the queue, not inside this call. All must outlive it. Precondition: the follower
+    /// has a modem.
     ModemSession(MainQueue& queue, ModemFollower& follower, Reports reports);
     ~ModemSession();
     ModemSession(const ModemSession&) = delete;
     ModemSession& operator=(const ModemSession&) = delete;
 
-    /// The follower's observer hands on what concerns the modem.
+    /// Forwarded by the follower's observer.
     void modemChanged();
     void objectChanged(const std::string& path, const Array& arguments);
 
 private:
-    /// A question that may be refused, and how many turns it is left out for.
+    /// A query that may be refused, and for how many intervals it is skipped.
     struct Question {
         std::string_view subject;
         int turns = 0;
@@ -64,7 +65,7 @@ private:
     struct Part {
         std::string_view interface;
         bool answered = false;    ///< whether with properties or with an error
-        DictionaryRef properties; ///< null until they have been told
+        DictionaryRef properties; ///< null until they have been reported
     };
 
     void turn();
@@ -94,9 +95,9 @@ private:
     std::string _name; ///< "modem 0", for messages
     Question _cellQuestion{"cells"};
     Question _placeQuestion{"place"};
-    int _partTurns = 0;                        ///< until the parts that could not be read are read again
-    bool _cellsTold = false;                   ///< the last cells were some
-    std::optional<std::uint32_t> _earlierRate; ///< what ModemManager's rate was; absent while it is not ours
+    int _partTurns = 0;                        ///< intervals until unreadable parts are retried
+    bool _cellsTold = false;                   ///< the last answer had cells
+    std::optional<std::uint32_t> _earlierRate; ///< ModemManager's earlier rate; absent while it is unchanged
     bool _hadSignal = false;
     Value _state;                       ///< the modem's when last looked at
     std::string _sim;                   ///< the SIM's path

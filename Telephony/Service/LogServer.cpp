@@ -153,7 +153,7 @@ void LogServer::close(LogChannel& channel, const std::string& why) {
         return;
     logFormat(LogPriority::Notice, "%s: closed, %s", channel.name().c_str(), why.c_str());
     channel.close();
-    // Not at once: messages may be on their way to the channels just now.
+    // Deferred: messages may just now be on their way to the channels.
     _queue.async([this, weak = std::weak_ptr<bool>(_alive)] {
         if (!weak.expired())
             sweep();

@@ -154,7 +154,7 @@ TEST_F(VelmoraPaneControllerTest, SectionOpensItsPaneWithThisOnesStatus) {
 TEST_F(VelmoraPaneControllerTest, NewPaneHasTheStatusBeforeTheStackShowsIt) {
     launchAndConnect();
     show(twoSections());
-    app.navController().setDelegate(nullptr); // nobody refreshes it as it is shown
+    app.navController().setDelegate(nullptr); // it is not refreshed when shown
     pane(0)->setStatus("as it was", true);
     clickRow(0);
     ASSERT_EQ(depth(), 2u);

@@ -31,7 +31,7 @@ TEST_P(MessageScriptStepTest, GivesItsStep) {
     EXPECT_FALSE(script.next());
 }
 
-// The length field is that of all bytes behind the type: 12 and the payload.
+// The length field counts all bytes after the type: 12 and the payload.
 constexpr StepCase steps[] = {
     {"Baseband", "00 3412 0200 AABB", "01 0E00 3412 0000000000000000 AABB"},
     {"Extra", "01 0100 0100 AA", "FF 0D00 0100 0000000000000000 AA"},

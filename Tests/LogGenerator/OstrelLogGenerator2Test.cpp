@@ -160,7 +160,7 @@ TEST_F(TemplateTest, SectionsOfACodeAreToldWithTheirNodesAsTheyThenStand) {
     ASSERT_EQ(effects.members.size(), 1U);
     EXPECT_EQ(effects.members[0].first, "SIM Info");
 
-    generator.updateStateTelling(state, record(0x1235, ""), effects); // nobody wants it
+    generator.updateStateTelling(state, record(0x1235, ""), effects); // it has no subscriber
     EXPECT_EQ(effects.code, 0x1235U);
     EXPECT_THAT(effects.members, IsEmpty());
     generator.updateStateTelling(state, hex("01 02"), effects);

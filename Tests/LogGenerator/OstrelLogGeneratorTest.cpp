@@ -110,7 +110,7 @@ TEST_F(DLFTest, OnlyTheFirstByteOfEachBufferGoes) {
     addToHistory(hex("01 AA BB 01 CC")); // two messages: the second keeps its type byte
     addToHistory(hex("01"));             // too short to hold anything
     addToHistory(hex("01 DD"));
-    history->append(makeDictionary()); // without raw material
+    history->append(makeDictionary()); // without raw messages
     EXPECT_EQ(dlf().from(161), hex("AA BB 01 CC DD"));
 }
 

@@ -12,7 +12,7 @@
 
 namespace velmora {
 
-/// Looks at the mutex behind the lock from another thread, and gives back what the lock keeps on purpose.
+/// Inspects the lock's mutex from another thread, and releases what the lock keeps by design.
 class ArrayLockProbe {
 public:
     static bool isHeldElsewhere() {

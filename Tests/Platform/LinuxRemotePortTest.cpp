@@ -211,7 +211,7 @@ TEST_F(LinuxRemotePortTest, APeerThatSendsOtherThingsDoesNotStretchTheTime) {
 
 TEST_F(LinuxRemotePortTest, AnAbsentPeerIsNoErrorAndAForeignOneIs) {
     EXPECT_FALSE(LinuxMessagePorts(_options).createRemote("nobody"));
-    _server.reset(); // as a crash leaves it: a socket that nobody listens on
+    _server.reset(); // as a crash leaves it: a socket without a listener
     EXPECT_FALSE(LinuxMessagePorts(_options).createRemote("peer"));
     EXPECT_THAT(_log.lines(), IsEmpty());
 

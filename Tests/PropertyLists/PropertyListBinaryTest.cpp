@@ -88,7 +88,7 @@ struct Bad {
 
 class BinaryBad : public testing::TestWithParam<Bad> {};
 
-// The object stands at offset 8 and the table right behind it.
+// The object is at offset 8 and the table right after it.
 TEST_P(BinaryBad, IsRefusedWithAReason) {
     EXPECT_EQ(reasonOf(listOf({hex(GetParam().hexText)})), GetParam().reason);
 }

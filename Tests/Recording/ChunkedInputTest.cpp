@@ -15,7 +15,7 @@
 namespace velmora {
 namespace {
 
-/// 32-bit little-endian numbers from 0 on, so that every place can be told from its content.
+/// 32-bit little-endian numbers from 0 on, so that every offset can be recognised by its content.
 Data counting(std::size_t words) {
     std::vector<std::uint8_t> bytes;
     for (std::size_t i = 0; i < words; ++i) {

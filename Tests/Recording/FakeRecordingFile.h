@@ -26,7 +26,7 @@ struct FakeMedium {
 
     std::size_t syncsStarted = 0;
     std::optional<int> syncOutcome; ///< of the sync under way; the test sets it
-    int syncError = 0;              ///< of the sync that is waited for; told once, as systems do
+    int syncError = 0;              ///< of the awaited sync; returned once, as systems do
     std::size_t syncsWaitedFor = 0;
     bool closed = false;
     int closeError = 0;

@@ -33,7 +33,7 @@ Data snapshot(bool binary) {
                         binary);
 }
 
-/// What is read holds together: numbers ascend, times are there, and what is not read is told.
+/// What is read is consistent: numbers ascend, times are present, and what is not read is reported.
 void expectSound(const Data& file, const std::string& what) {
     const ReadOut out = readAnyForm(file);
     if (!out.failure.empty()) {

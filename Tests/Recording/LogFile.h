@@ -26,7 +26,7 @@ namespace velmora {
 /// A time stamp: 2026-11-16 05:00:00 UTC and so many units of 1.25 ms.
 [[nodiscard]] std::uint64_t stampAfter(std::uint64_t units);
 
-/// A history entry with that raw material and that date.
+/// A history entry with these raw messages and that date.
 [[nodiscard]] DictionaryRef historyEntry(Value rawMaterial, std::string_view date);
 /// A snapshot of the entries.
 [[nodiscard]] Value snapshotOf(std::initializer_list<Value> entries);

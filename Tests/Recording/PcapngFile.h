@@ -16,7 +16,7 @@
 
 namespace velmora {
 
-/// Blocks one behind the other, in one byte order. Every call appends.
+/// Blocks one after another, in one byte order. Every call appends.
 class PcapngFile {
 public:
     explicit PcapngFile(bool bigEndian = false) : _bigEndian(bigEndian) {}

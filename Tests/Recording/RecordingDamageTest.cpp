@@ -205,7 +205,7 @@ TEST(RecordingDamage, ofAnyOneByteGivesMessagesOrLosses) {
             // The head's damage may change how all is read; a block's changes that block alone.
             if (at >= 76) {
                 EXPECT_GE(kept, 3) << where;
-                // A changed type makes a block of another kind, which is no loss that anybody could know of.
+                // A changed type makes a block of another kind, which is a loss that cannot be detected.
                 const bool inType = (at - 76) % 40 < 4;
                 EXPECT_TRUE(inType || out.messages.size() + out.losses.size() >= 4) << where;
             } else {
@@ -223,7 +223,7 @@ TEST(RecordingDamage, ofAnyKindKeepsMessagesAndLossesInOrderAndApart) {
         file.head();
         for (std::size_t i = 0; i < 30; ++i)
             file.message(i, std::vector<std::uint8_t>(random() % 50, static_cast<std::uint8_t>(i)));
-        // A few bytes changed, taken out or put in, behind the first section's magic.
+        // A few bytes changed, removed or inserted, after the first section's magic.
         for (auto changes = random() % 6; changes > 0; --changes) {
             const auto place = file.bytes().begin() + 12 + static_cast<long>(random() % (file.size() - 12));
             const auto length = std::min<long>(static_cast<long>(random() % 9), file.bytes().end() - place);
@@ -248,7 +248,7 @@ TEST(RecordingDamage, ofAnyKindKeepsMessagesAndLossesInOrderAndApart) {
             end = message->offset + 16 + message->message.size();
             ASSERT_LE(end, data.size()) << round;
             stretches.emplace_back(message->offset, end);
-            // Its bytes stand in the file, behind a header of 12 (simple) or 28 bytes.
+            // Its bytes are in the file, after a header of 12 (simple) or 28 bytes.
             const auto standsBehind = [&](std::size_t header) {
                 const std::size_t begin = message->offset + header;
                 return begin + message->message.size() <= data.size() &&

@@ -44,7 +44,7 @@ TEST_F(RecordingSyncTest, WhatTheMediumLostIsWrittenOnceMore) {
     ASSERT_TRUE(append(3));
     ASSERT_TRUE(writer->flush());
     EXPECT_THAT(numbers(), ElementsAre(1, 2, 3));
-    // The second message never reached the medium, and nobody knows of the third.
+    // The second message was never synced, and the third is unknown.
     medium.syncOutcome = EIO;
     EXPECT_EQ(reasonOf(writer->sync()), broken);
     EXPECT_TRUE(writer->isWaiting());
@@ -102,7 +102,7 @@ TEST_F(RecordingSyncTest, FileSystemWithoutAMediumIsNoTrouble) {
 TEST_F(RecordingSyncTest, KeepsNoMoreThanItsShareForASlowMedium) {
     start();
     ASSERT_TRUE(writer->sync());
-    // The medium says nothing while 9 MiB are written, one more than are kept.
+    // The sync does not finish while 9 MiB are written, one more than are kept.
     const std::vector<std::uint8_t> large(1 << 20, 7);
     for (int i = 0; i < 9; ++i)
         ASSERT_TRUE(writer->append(Time(), large));

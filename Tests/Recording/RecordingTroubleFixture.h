@@ -24,7 +24,7 @@ inline constexpr std::size_t blockSize = 36; // of a message of 1 to 4 bytes
 inline const std::string full = "cannot write the recording: No space left on device";
 inline const std::string broken = "cannot write the recording: Input/output error";
 
-/// A recording on a disk that gives trouble. Each message is one byte, its number.
+/// A recording on a disk with errors. Each message is one byte, its number.
 class RecordingTroubleFixture : public testing::Test {
 protected:
     void start() {

@@ -219,7 +219,7 @@ TEST(RecordingWriter, tellsThatTheMediumIsFull) {
 }
 
 TEST(RecordingWriter, tellsAWriteErrorEverAfter) {
-    // The file turns full behind the writer's back once its head is written.
+    // The disk becomes full once the header is written.
     TemporaryDirectory directory;
     const std::string path = directory / "recording";
     const int descriptor = ::open(path.c_str(), O_WRONLY | O_CREAT, 0600);

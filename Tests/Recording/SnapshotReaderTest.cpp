@@ -39,7 +39,7 @@ TEST(SnapshotReader, givesTheMessagesOfEachRefresh) {
             {historyEntry(joined(idle(), registered(), registered()), "2026-11-16 05:00:02 +0000"),
              historyEntry(registered(), "2026-11-16 05:00:04 +0000")},
             binary));
-        // Offsets are those in the entry's raw material, 49 bytes; the times spread over the 2 s before.
+        // Offsets are those in the entry's raw messages, 49 bytes; the times spread over the 2 s before.
         EXPECT_THAT(
             out.messages,
             ElementsAre("1 at 0, " + at(0) + ": " + idleHex,

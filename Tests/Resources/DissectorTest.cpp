@@ -121,7 +121,7 @@ TEST_F(Dissector, agreesOnEveryMessageOfTheRecordings) {
     }
 }
 
-/// The code and the sections of each message, as velmora-log tells of it.
+/// The code and the sections of each message, as velmora-log lists it.
 TEST_F(Dissector, agreesWithTheCommandLine) {
     for (const ExampleRecording& recording : exampleRecordings()) {
         const std::string path = VELMORA_SOURCE_DIR "/Tests/Recordings/" + recording.fileName();

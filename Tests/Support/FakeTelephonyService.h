@@ -49,7 +49,7 @@ public:
             callback();
     }
 
-    /// Connections that somebody holds.
+    /// Connections that are held.
     [[nodiscard]] int liveConnections() const { return *_liveConnections; }
     /// How often a connection was asked for, in vain or not.
     [[nodiscard]] int connectionsAsked() const { return _connectionsAsked; }

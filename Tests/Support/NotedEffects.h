@@ -11,13 +11,14 @@
 
 namespace velmora {
 
-/// What a decoder has told of messages: the latest message's code and the names and values, in order.
+/// Records what a decoder has reported of messages: the latest message's code and the names and values, in
+/// order.
 class NotedEffects final : public MessageEffects {
 public:
     enum class Kind { None, Sections, Values, Display };
 
     Kind kind = Kind::None;
-    int messages = 0; ///< how many have been told of
+    int messages = 0; ///< number of reported messages
     std::optional<std::uint32_t> code;
     std::vector<std::pair<std::string, Value>> members;
 

@@ -112,7 +112,7 @@ TEST_P(ReplayFormsTest, snapshot) {
         }
         EXPECT_EQ(date, refresh.time);
         if (technology == "IFX") {
-            // The object of the last message, written anew.
+            // The object of the last message, serialized again.
             ASSERT_EQ(got.size(), 1u);
             EXPECT_EQ(*readPropertyList(got[0].bytes()), *readPropertyList(wanted.back().bytes()));
             EXPECT_EQ(displayOf(got), refresh.display);
@@ -146,8 +146,8 @@ TEST_P(ReplayFormsTest, dlfLogOfASnapshot) {
     EXPECT_EQ(replayed(path), wanted);
 }
 
-/// Every buffer of a long drive as the application's log has it: less its first byte, with all that is odd
-/// about the drive's messages.
+/// Every buffer of a long drive as the application's log has it: less its first byte, with all that is
+/// unusual about the drive's messages.
 TEST_P(ReplayFormsTest, dlfLogOfManyBuffers) {
     if (technology == "IFX")
         GTEST_SKIP() << "its messages are no records";

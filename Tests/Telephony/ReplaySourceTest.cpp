@@ -28,7 +28,7 @@ using ::testing::IsEmpty;
 struct FakeFile {
     std::string technology = "Ostrel_GSM";
     std::vector<std::pair<std::chrono::nanoseconds, Data>> messages; ///< by time since some hour
-    std::vector<Loss> losses;                                        ///< told at the end
+    std::vector<Loss> losses;                                        ///< reported at the end
     std::optional<Failure> failure;                                  ///< the end's
 };
 

@@ -166,7 +166,7 @@ TEST_F(TelephonydTest, replaysAFileAsFastAsItsClientTakesItAndLosesNothing) {
 }
 
 TEST_F(TelephonydTest, replaysALogThatDoesNotTellItsTechnology) {
-    // A code of nobody's, in a log of bare records.
+    // A code without subscriber, in a log of bare records.
     const Data message = recordOf(0x1375, {});
     std::vector<std::uint8_t> content;
     for (int i = 0; i < 3; ++i)

@@ -23,7 +23,7 @@
 
 namespace velmora {
 
-/// The one of this program, on a screen that nobody sees.
+/// The one of this program, on an offscreen display.
 [[nodiscard]] Application& testApplication();
 
 /// Serves events until `done`; fails after ten seconds.
@@ -45,7 +45,7 @@ public:
     ReducedMotion& operator=(const ReducedMotion&) = delete;
 };
 
-/// A pane whose rows are the given texts, all under one identifier; keeps what it was asked and told.
+/// A pane whose rows are the given texts, all under one identifier; records its calls.
 class ListPane : public TableViewController {
 public:
     explicit ListPane(std::vector<std::string> rowTexts, std::string_view title = {});

@@ -8,9 +8,9 @@ class QWidget;
 
 namespace velmora {
 
-/// Has the widget's content follow the first finger of a touch, and run on when it is let go in motion: the
-/// widget gets QScrollPrepareEvent and QScrollEvent. True when the finger scrolls or stops what ran on, so
-/// that it means nothing else.
+/// Scrolls the widget's content by the first touch point, with kinetic scrolling after release: the widget
+/// gets QScrollPrepareEvent and QScrollEvent. True when the touch scrolls or stops a scroll, so that it is no
+/// tap.
 bool followFinger(QWidget& widget, const QTouchEvent& event);
 
 } // namespace velmora

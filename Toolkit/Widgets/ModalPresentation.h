@@ -26,7 +26,7 @@ public:
     [[nodiscard]] const std::shared_ptr<ViewController>& viewController() const { return _viewController; }
     void present(bool animated);
     void dismiss(bool animated);
-    /// The presenter is going: takes the sheet away without notice to anyone.
+    /// The presenter is being destroyed: removes the sheet without notifications.
     void abandon();
 
 private:

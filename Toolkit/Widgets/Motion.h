@@ -12,23 +12,24 @@ class QVariantAnimation;
 
 namespace velmora {
 
-/// Whether things may move by themselves: neither the user's style nor the environment
-/// (VELMORA_REDUCED_MOTION set to anything but 0) asks for reduced motion.
+/// Whether animations are enabled: neither the user's style nor the environment (VELMORA_REDUCED_MOTION set
+/// to anything but 0) asks for reduced motion.
 [[nodiscard]] bool wantsMotion();
 
-/// One movement at a time, from 0 to 1, that can be cut short. Its owner may be destroyed by what it calls.
+/// One animation at a time, from 0 to 1, that can be ended early. Its owner may be destroyed in its
+/// callbacks.
 class Motion {
 public:
     using Step = std::function<void(double)>;
 
     Motion() = default;
-    /// Cuts short without calling anything.
+    /// Stops without calling anything.
     ~Motion();
     Motion(const Motion&) = delete;
     Motion& operator=(const Motion&) = delete;
 
-    /// Ends an earlier movement first. Steps as long as the movement lasts, the last step being 1, then calls
-    /// `atEnd`; does both at once when not animated or when no motion is wanted.
+    /// Ends an earlier animation first. Calls `step` during the animation, with 1 at last, then `atEnd`; both
+    /// immediately when not animated or with reduced motion.
     void start(bool animated, Step step, std::function<void()> atEnd);
     /// Jumps to the end.
     void finish();

@@ -23,9 +23,9 @@ public:
     /// Puts the pane in the old one's place (there may be none): from the right when it is pushed, uncovered
     /// from the left otherwise. An earlier movement ends first.
     void showPane(View& pane, View* old, bool isPush, bool animated, std::function<void()> atEnd);
-    /// Leaves the place empty.
+    /// Leaves the pane area empty.
     void removePane();
-    /// Ends a movement under way.
+    /// Ends an animation in progress.
     void finish();
 
     void layoutSubviews() override;

@@ -58,7 +58,7 @@ void SpinnerWidget::paintEvent(QPaintEvent* /*event*/) {
     painter.translate(width() / 2.0, height() / 2.0);
     QColor gray = palette().color(QPalette::WindowText);
     for (int spoke = 0; spoke < spokes; ++spoke) {
-        // The spoke at the step is the strongest, those before it fade behind it.
+        // The spoke at the step is the strongest, those before it fade out.
         const int age = (_step - spoke + spokes) % spokes;
         gray.setAlphaF(0.65F * static_cast<float>(std::max(spokes - age, 3)) / spokes);
         painter.save();

@@ -23,7 +23,7 @@ public:
 
     using Show = std::function<void(std::string_view line)>;
 
-    /// `size`: the input's, in bytes, above 0. `clock` must outlive it. Shows 0 % at once.
+    /// `size`: the input's, in bytes, above 0. `clock` must outlive it. Prints 0 % immediately.
     DecodeProgress(std::uint64_t size, const Clock& clock, Show show);
 
     /// The input has been read up to there.

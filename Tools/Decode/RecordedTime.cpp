@@ -16,7 +16,7 @@ std::optional<Time> RecordedTicks::reach(Time message) {
         return std::nullopt;
     }
     // Messages have come since the last tick: each call but the first follows one, and only the first of
-    // several ticks that are due at once has had any.
+    // several simultaneous ticks has had any.
     const Time tick = _next;
     advancePast(message);
     return tick;

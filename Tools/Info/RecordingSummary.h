@@ -17,7 +17,7 @@ namespace velmora {
 /// Counts of a recording, made message by message.
 class RecordingSummary {
 public:
-    /// Messages of one kind, and where the first of them stands.
+    /// Messages of one kind, and the position of the first.
     struct Count {
         std::uint64_t messages = 0;
         std::uint64_t firstNumber = 0;

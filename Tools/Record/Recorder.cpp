@@ -21,7 +21,7 @@ namespace {
 
 using namespace std::chrono_literals;
 
-/// How long a message may wait before it is in the file, which leaves the medium the rest of a second.
+/// How long a message may be buffered, which leaves the rest of a second for the sync.
 constexpr auto saveInterval = 500ms;
 /// How often writing is retried while the file cannot be written, and the progress is shown.
 constexpr auto progressInterval = 1s;

@@ -40,7 +40,7 @@ private:
     ServiceClient& _client;
     RecordingNews _news;
     std::shared_ptr<RecordingModel> _model;
-    bool _streaming = false; ///< the service has been told to send
+    bool _streaming = false; ///< the start command has been sent send
     bool _gone = false;      ///< the service is gone, and the user has been told
     bool _ended = false;
 };

@@ -29,8 +29,8 @@ public:
     RecordingSession(const RecordingSession&) = delete;
     RecordingSession& operator=(const RecordingSession&) = delete;
 
-    /// The service has named the technology. The first time this begins the recording; another one after that
-    /// is a failure.
+    /// To be called when the service has named the technology. The first call starts the recording; another
+    /// technology after that is a failure.
     Result<Done> learnTechnology(std::string_view technology);
     /// A message has arrived. A failure ends the recording; an error that may pass is none (see `trouble`).
     /// Precondition: the technology is known.
@@ -43,7 +43,7 @@ public:
 
     /// The technology's short name; empty while it is unknown.
     [[nodiscard]] const std::string& technology() const { return _technology; }
-    /// Messages that arrived and were not dropped, those that wait included.
+    /// Messages that arrived and were not dropped, including queued ones.
     [[nodiscard]] std::uint64_t messages() const { return _writer ? _writer->messages() : 0; }
     /// The bytes of these.
     [[nodiscard]] std::uint64_t bytes() const { return _bytes; }
@@ -51,11 +51,11 @@ public:
     [[nodiscard]] recordingBlocks::PacketCount unsaved() const {
         return _writer ? _writer->unsaved() : recordingBlocks::PacketCount();
     }
-    /// Messages for which there was no room while the file could not be written.
+    /// Messages dropped while the file could not be written.
     [[nodiscard]] std::uint64_t dropped() const { return _writer ? _writer->droppedMessages() : 0; }
-    /// Why the file cannot be written at the moment; empty when it can. The messages wait.
+    /// The temporary error; empty when there is none. Messages are queued meanwhile.
     [[nodiscard]] const std::string& trouble() const { return _trouble; }
-    /// Whether there is no more room for messages to wait.
+    /// Whether the queue is full.
     [[nodiscard]] bool isDropping() const { return _writer && _writer->isDropping(); }
     /// Whether the recording goes to a pipe whose reader has closed it.
     [[nodiscard]] bool hasLostReader() const;
@@ -71,7 +71,7 @@ private:
 
     std::string _path;
     FileDescriptor _file;  ///< until the writer has it
-    bool _created = false; ///< the file is ours to remove
+    bool _created = false; ///< this created the file
     std::unique_ptr<RecordingWriter> _writer;
     std::string _technology;
     std::string _trouble;

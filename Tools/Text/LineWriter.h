@@ -32,7 +32,7 @@ protected:
 private:
     bool _isLive;
     TextBuffer _lines;
-    std::size_t _complete = 0; ///< how much of it is whole lines
+    std::size_t _complete = 0; ///< how much of it is complete lines
     TimeText _time;
 };
 

@@ -18,7 +18,7 @@ namespace velmora {
 /// East Asian wide characters and emoji, otherwise one a character.
 [[nodiscard]] std::size_t displayWidth(std::string_view text);
 
-/// As much of the front of printable text as fits into `columns`; what had to be cut ends in "…".
+/// The longest prefix of printable text that fits into `columns`; a truncated one ends in "…".
 [[nodiscard]] std::string clipped(std::string_view text, std::size_t columns);
 
 } // namespace velmora

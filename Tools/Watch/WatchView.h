@@ -21,7 +21,7 @@ public:
     virtual ~WatchView() = default;
     /// A refresh: the status line and the display tree's rows.
     virtual void showRefresh(const std::string& status, std::vector<TreeRow> rows) = 0;
-    /// The connection is lost, or there again; the rows are as they were.
+    /// The connection is lost or re-established; the rows are unchanged.
     virtual void showStatus(const std::string& status) = 0;
     /// Whether there is still a reader or a terminal.
     [[nodiscard]] virtual bool isOpen() const = 0;
@@ -29,7 +29,7 @@ public:
     virtual void leave() {}
 };
 
-/// Prints each refresh in turn, headed by the status line, a blank line between two.
+/// Prints each refresh after its status line, a blank line between two.
 class PipeView final : public WatchView {
 public:
     explicit PipeView(Output& output) : _output(output) {}
@@ -46,7 +46,7 @@ private:
 /// restored.
 class ScreenView final : public WatchView {
 public:
-    /// `quit` is called when the user wants to end, or the terminal is gone.
+    /// `quit` is called when the user quits or the terminal has been closed.
     explicit ScreenView(std::function<void()> quit);
     void showRefresh(const std::string& status, std::vector<TreeRow> rows) override;
     void showStatus(const std::string& status) override;

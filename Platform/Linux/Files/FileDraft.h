@@ -20,28 +20,28 @@ class FileDraft {
 public:
     enum class WhereThereIsOne { Replace, Refuse };
 
-    /// `mode`: the permissions where there is no file to take them from, less the process's mask.
+    /// `mode`: the permissions of a new file, less the process's umask; an existing file's are kept.
     static Result<FileDraft> create(const std::filesystem::path& target, mode_t mode);
     ~FileDraft() { discard(); }
     FileDraft(FileDraft&& other) noexcept;
     FileDraft& operator=(FileDraft&&) = delete;
 
-    /// Where the content goes; stays the draft's.
+    /// The descriptor to write the content to; still owned by this.
     [[nodiscard]] int descriptor() const { return _file.get(); }
-    /// The draft's own name.
+    /// The temporary name.
     [[nodiscard]] const std::string& path() const { return _path; }
 
-    /// Has the content put on the disk, and then gives it its name. The draft is gone after that, whatever
-    /// the outcome.
+    /// Syncs the content to storage and renames it. The temporary file is gone afterwards, whatever the
+    /// outcome.
     Result<Done> publish(WhereThereIsOne choice);
-    /// Removes the draft.
+    /// Removes the temporary file.
     void discard();
 
 private:
     FileDraft(std::filesystem::path target, std::string path, FileDescriptor file);
 
     std::filesystem::path _target;
-    std::string _path; ///< empty when there is no draft any more
+    std::string _path; ///< empty once it is committed or discarded
     FileDescriptor _file;
 };
 

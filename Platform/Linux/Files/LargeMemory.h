@@ -5,10 +5,9 @@
 
 namespace velmora {
 
-/// For a program that decodes live, called once at its start: large pieces of memory go back to the system as
-/// soon as they are given up. Left alone, the C library takes the release of one as a sign to keep the next
-/// in its heap, and the messages of each refresh, which come and go among what stays, would stretch that for
-/// hours.
+/// For a program that decodes live, called once at its start: large allocations are returned to the system as
+/// soon as they are freed. By default the C library raises its mmap threshold whenever one is freed and keeps
+/// the next in its heap, which the messages of each refresh would then fragment for hours.
 void giveBackLargeMemory();
 
 } // namespace velmora

@@ -9,7 +9,7 @@
 
 namespace velmora {
 
-/// The machine's files, with a system root put before the paths that the platform fixes: for tests, and for
+/// The machine's files, with a system root as prefix of the paths that the platform fixes: for tests, and for
 /// machines that have no such tree.
 class LinuxFileSystem final : public FileSystem {
 public:
@@ -23,8 +23,8 @@ public:
 
     explicit LinuxFileSystem(Options options = {});
 
-    /// Makes the standard directory for snapshots where it is missing. One that was named is its user's
-    /// business and is left alone. The reason names the directory.
+    /// Creates the default directory for snapshots if it is missing; one that the user named is not created.
+    /// The reason names the directory.
     Result<Done> makeStandardLogDirectory() const;
 
     [[nodiscard]] bool exists(std::string_view absolutePath) const override;

@@ -211,7 +211,7 @@ RemotePort::Answer LinuxRemotePort::awaitReply(std::uint32_t serial, Deadline de
         }
         if (!_socket)
             return {PortStatus::BecameInvalid, std::nullopt};
-        // A peer that keeps sending other things must not stretch the time.
+        // A peer that keeps sending other frames must not extend the time-out.
         if (late || !waitFor(_socket.get(), POLLIN, deadline))
             return {PortStatus::ReceiveTimeout, std::nullopt};
         late = SteadyClock::now() >= deadline;
@@ -289,7 +289,7 @@ void LinuxRemotePort::reportDropped() {
         return;
     logFormat(LogPriority::Error, "Message port %s: messages dropped because the peer is slow: %" PRIu64,
               _name.c_str(), std::exchange(_unreported, 0));
-    // What is dropped meanwhile is told when a second has passed.
+    // What is dropped meanwhile is reported after a second.
     _droppedReport.startOnce(std::chrono::seconds(1));
 }
 

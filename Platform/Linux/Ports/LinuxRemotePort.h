@@ -66,10 +66,10 @@ private:
     FileDescriptor _socket;
     FrameReader _reader;
     FrameQueue _queue;
-    bool _blocked = false; ///< the socket took no more when last tried
+    bool _blocked = false; ///< the last write would have blocked
     std::uint32_t _lastSerial = 0;
     std::uint64_t _dropped = 0;
-    std::uint64_t _unreported = 0; ///< dropped messages that no line has told of yet
+    std::uint64_t _unreported = 0; ///< dropped messages that are not logged yet
     LogLimiter _tooLong{std::chrono::seconds(1)};
     std::unique_ptr<SocketWatch> _readWatch;
     std::unique_ptr<SocketWatch> _writeWatch;

@@ -25,10 +25,10 @@ namespace velmora {
 ///   EV-DO is Inactive meanwhile, as the one transmitter is the call's, and comes back after it.
 /// - A second EV-DO connection, then power-off, and again from the start, at another place of the ring.
 ///
-/// About ten messages come a second, twenty in a call. Every ten seconds or so a message is odd (see Damage):
-/// records of all kinds that come too short, a system identification that lacks the base station, counts that
-/// are too high, sub-packets that are missing or too large. There is no extra stream.
-/// Main thread only.
+/// About ten messages come a second, twenty in a call. About every ten seconds a message is unusual (see
+/// Damage): records of all kinds that come too short, a system identification that lacks the base station,
+/// counts that are too high, sub-packets that are missing or too large. There is no extra stream. Main thread
+/// only.
 class C2KScenario final : public DriveScenario {
 public:
     explicit C2KScenario(std::uint64_t seed);
@@ -37,7 +37,7 @@ public:
 private:
     static const Phase phases[];
 
-    /// What the phone goes through; each puts its steps on the script, from now on.
+    /// The phone's procedures; each adds its steps to the script, from now on.
     void powerOn();
     void connect();
     void disconnect();

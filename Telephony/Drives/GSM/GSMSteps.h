@@ -35,7 +35,7 @@ protected:
     void release(double at);
     /// The network's acceptance of a location update: identities and the equivalent networks.
     void accept(double at);
-    /// The phone moves to the best cell there; its record, none where there is no cell.
+    /// The phone camps on the best cell; returns its record, none where there is no cell.
     [[nodiscard]] std::optional<RecordBuilder> campOnGSM();
     [[nodiscard]] std::optional<RecordBuilder> campOnUMTS();
 

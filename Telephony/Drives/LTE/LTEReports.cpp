@@ -164,7 +164,7 @@ Report neighbours(Context& context) {
 Report candidates(Context& context) {
     if (!context.phone.serving)
         return std::nullopt;
-    // One candidate of each type in turn, then several at once.
+    // One candidate of each type, one after another, then several together.
     const std::size_t turn = context.candidates++ % (std::size(everyType) + 1);
     std::vector<ReselectionCandidate> list;
     if (turn < std::size(everyType)) {

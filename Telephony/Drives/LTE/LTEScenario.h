@@ -28,10 +28,9 @@ namespace velmora {
 /// and cell the priority and type of the one after it, since that is where the record has them.
 ///
 /// From six to eight messages come a second. The extra stream reports the SIM, the cells around and the
-/// contexts, as binary and XML property lists in turn. Every ten seconds or so a message is odd (see Damage):
-/// the records of serving cell, idle and connected measurement, neighbours and candidates come too short by
-/// turns, and each of the three counted ones with a count too high.
-/// Main thread only.
+/// contexts, as binary and XML property lists in turn. About every ten seconds a message is unusual (see
+/// Damage): the records of serving cell, idle and connected measurement, neighbours and candidates are too
+/// short in rotation, and each of the three counted ones has a count that is too high. Main thread only.
 class LTEScenario final : public DriveScenario {
 public:
     explicit LTEScenario(std::uint64_t seed);
@@ -40,7 +39,7 @@ public:
 private:
     static const Phase phases[];
 
-    /// What the phone goes through; each puts its steps on the script, from now on.
+    /// The phone's procedures; each adds its steps to the script, from now on.
     void powerOn();
     void registerWithNetwork();
     void startSession();

@@ -150,7 +150,7 @@ void UTRANScenario::react() {
         say(0, [this] { return utranReports::serving(_context); });
         return;
     }
-    // Idle in an area that the network does not know the phone to be in, it registers anew.
+    // Idle in an area that the network does not know the phone to be in, it registers again.
     if (script().empty() && _phone.registered && _phone.rrc == RRCState::Disconnected && _phone.serving &&
         _phone.serving->cell.area != _phone.registeredArea)
         registerWithNetwork();

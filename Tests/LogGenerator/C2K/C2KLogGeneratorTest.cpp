@@ -378,7 +378,7 @@ TEST(C2KProcessTemplateTest, CopiesMarkersSkipsForeignValuesAndNests) {
     std::vector<std::string> keys;
     for (const auto& [key, targets] : lookup)
         keys.push_back(key);
-    EXPECT_THAT(keys, ElementsAre("", "kC")); // an empty text is a key that nobody produces
+    EXPECT_THAT(keys, ElementsAre("", "kC")); // an empty text is a key that no parser publishes
     EXPECT_EQ(lookup["kC"].asArray()->size(), 2u);
     // One a level, and the levels are four: Innermost, Inner, Hollow, the root.
     EXPECT_EQ(log.lines(), LogLines(4, {LogPriority::Warning, "Processing the template"}));
@@ -414,7 +414,7 @@ TEST_F(C2KLogGeneratorTest, LabelsOfAnyLengthShowTheirFields) {
         const std::string label(length, 'L');
         resources.put("C2KTemplate", "plist", dictionary({{label, "kColorCode"}, {"Channel", "kChannel"}}));
         Dictionary itsState;
-        // EV-DO status: 50 bytes, all zero behind the header.
+        // EV-DO status: 50 bytes, all zero after the header.
         generator->updateState(itsState, recordWith(0x1183, 50));
         generator->updateState(itsState, recordWith(0x1183, 50));
         EXPECT_EQ(shown(generator->display(itsState)), "{" + label + " '0', Channel '0'}") << length;

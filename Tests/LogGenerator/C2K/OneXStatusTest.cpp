@@ -258,8 +258,7 @@ TEST(OneXStatusTest, EveryPrefix) {
             EXPECT_EQ(parser.lines(), error(is + "its subpkt#1 needs at least 29 bytes."));
         } else if (length < 43) {
             EXPECT_EQ(parser.lines(), error(is + "its subpkt#2 needs at least 43 bytes."));
-        } else if (length <=
-                   74) { // the active set's end, 91, lies at or behind 17 + length: for two searches
+        } else if (length <= 74) { // the active set's end, 91, lies at or past 17 + length: for two searches
             LogLines expected(2, error("Log code error in subpkt#2: bad size (52).")[0]);
             expected.push_back(missing("ss=1,rf=1,ai=0,fi=0")[0]);
             EXPECT_EQ(parser.lines(), expected);

@@ -97,7 +97,7 @@ TEST(GSMScenarioTest, aboutTwentyMessagesComeASecond) {
 TEST(GSMScenarioTest, recordsAreAsTheirTablesSayButForTheOddOnes) {
     const RecordCensus census = censusOf(tenMinutes(), requirements);
     EXPECT_EQ(codesOf(census.good), codes);
-    // One odd message every ten seconds, a sixth of them of each kind.
+    // One unusual message every ten seconds, a sixth of them of each kind.
     EXPECT_GE(countOf(census.belowMinimum), 3U);
     EXPECT_LE(countOf(census.belowMinimum), 20U);
     EXPECT_GE(countOf(census.overrun), 3U);

@@ -112,7 +112,7 @@ TEST(LTEScenarioTest, sixToEightMessagesComeASecond) {
 TEST(LTEScenarioTest, recordsAreAsTheirTablesSayButForTheOddOnes) {
     const RecordCensus census = censusOf(twentyMinutes(), requirements);
     EXPECT_EQ(codesOf(census.good), codes);
-    // One odd message every ten seconds, a sixth of them of each kind, by turns of these codes.
+    // One unusual message every ten seconds, a sixth of them of each kind, alternating between these codes.
     EXPECT_EQ(codesOf(census.belowMinimum),
               (std::set<std::uint32_t>{0xB0C2, 0xB179, 0xB17F, 0xB180, 0xB186}));
     EXPECT_LE(countOf(census.belowMinimum), 40U);

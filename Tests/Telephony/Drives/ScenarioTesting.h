@@ -73,7 +73,7 @@ template <class Entry>
 /// How many records all codes have together.
 [[nodiscard]] std::size_t countOf(const std::map<std::uint32_t, std::vector<Bytes>>& records);
 
-/// The messages of a drive that are odd about their framing, or of a code that has no table.
+/// The messages of a drive with unusual framing, or of a code without a table.
 struct OddMessages {
     int tooShort = 0; ///< five bytes
     int wrongType = 0;

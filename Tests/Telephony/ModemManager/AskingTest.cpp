@@ -149,7 +149,7 @@ TEST_F(AskingTest, whatIsNotSupportedIsToldOnceAndTriedAgainAfterAMinute) {
     mock.change(Mock::modemPath(0), Mock::modem, {{"State", 11}});
     EXPECT_TRUE(passes([this] { return count(cellCode) == 1 && rates().size() == 2; }))
         << "another state of the modem is a reason to try";
-    // Over in between, it is told again.
+    // Cleared in between, it is reported again.
     refuse("GetCellInfo", "org.freedesktop.ModemManager1.Error.Core.Unsupported", "no cells");
     EXPECT_TRUE(passes([this] { return warnings().size() == 4; }));
     EXPECT_EQ(latest(cellCode), Value(makeArray())) << "what is not known any more is not shown any more";
@@ -179,7 +179,7 @@ TEST_F(AskingTest, theRateOfTheLevelsIsSetAndPutBack) {
     follow();
     listen();
     ASSERT_TRUE(comes([this] { return rates().size() == 1; }));
-    // ModemManager tells of the new rate, and that is no reason to set it again.
+    // ModemManager signals the new rate, which is no reason to set it again.
     mock.change(Mock::modemPath(0), Mock::signal, {{"Rate", 5U}});
     drain();
     source->stop();

@@ -123,7 +123,7 @@ TEST_F(BearersTest, aModemWithoutBearersShowsItsLink) {
         link.asDictionary()->set(label, text);
     ASSERT_TRUE(tells(contextCode, std::make_shared<Array>(Array{link})));
 
-    // Levels change often; they are told together.
+    // Levels change often; they are reported together.
     const std::size_t before = count(contextCode);
     for (int i = 0; i < 50; ++i)
         mock.change(Mock::modemPath(0), Mock::signal, {{"Lte", QVariantMap{{"rsrp", -100.0 - i * 0.1}}}});

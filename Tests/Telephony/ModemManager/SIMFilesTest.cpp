@@ -40,7 +40,7 @@ TEST_F(SIMFilesTest, theSIMsFilesAreShown) {
                           {"EF-ACTING HPLMN", "001-01"},
                           {"EF-PLMN NETWORK NAME", "Test Network"},
                           {"EF-OPLMNAcT", "001-02 (LTE), 310-260 (GSM, GPRS, UMTS), 999-99"}}));
-    // What does not change is not told again.
+    // What does not change is not reported again.
     queue.advance(10min);
     drain();
     EXPECT_EQ(count(simCode), 1U);

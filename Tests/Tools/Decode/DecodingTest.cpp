@@ -25,7 +25,7 @@ using testing::IsEmpty;
 /// Messages that the test has made, numbered from 1.
 class ListReader final : public MessageReader {
 public:
-    /// The refreshes that the file tells of, by the number of the message before.
+    /// The refreshes recorded in the file, by the number of the preceding message.
     std::map<std::uint64_t, Time> refreshes;
 
     ListReader(std::string technology, const std::vector<TimedMessage>& messages)
@@ -85,7 +85,7 @@ protected:
                                             const TimeRange& range = {}) {
         return refreshesOf(messages, {}, range);
     }
-    /// As above, where the file tells of refreshes: by the number of the message before.
+    /// As above, where the file records refreshes: by the number of the preceding message.
     static std::vector<Refresh> refreshesOf(const std::vector<TimedMessage>& messages,
                                             std::map<std::uint64_t, Time> told, const TimeRange& range) {
         ListReader reader("Ostrel_GSM", messages);

@@ -142,7 +142,7 @@ TEST_F(RecordTroubleTest, TerminalShowsProgress) {
     ASSERT_TRUE(process.waitFor(" s\r\x1b[K", *progress)) << "the line is written over";
     process.limitFileSize(size());
     _service->send(rrState(2));
-    // What is told stands on a line of its own, and the progress below it.
+    // A report has a line of its own, with the progress below it.
     const auto told = process.waitFor("\r\x1b[Kvelmora-log: " + _waiting + "\r\n", *progress);
     ASSERT_TRUE(told);
     ASSERT_TRUE(process.waitFor("2 messages, 34 bytes, ", *told));

@@ -60,7 +60,7 @@ protected:
 TEST_F(RecordingSessionTest, OverwrittenFileGivesWayInOneStep) {
     putOld();
     std::filesystem::permissions(_file, std::filesystem::perms(0640));
-    std::ifstream old(_file); // whoever has it open keeps it
+    std::ifstream old(_file); // an open descriptor keeps it
     const auto session = RecordingSession::open(_file, true);
     ASSERT_TRUE(session);
     EXPECT_EQ(contentOf("drives/drive.pcapng"), "old");

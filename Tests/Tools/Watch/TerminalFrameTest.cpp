@@ -30,7 +30,7 @@ TEST(TerminalFrameTest, WithoutRowsTheScreenIsBlankAboveTheStatusLine) {
 }
 
 TEST(TerminalFrameTest, LongRowsAndStatusAreCutAtTheWindow) {
-    // A full line is not cleared behind its end: that would take its last character.
+    // A full line is not cleared past its end: that would take its last character.
     EXPECT_EQ(composeFrame({{"0123456789", false}, {"01234567", false}}, "0123456789", {8, 3}, 0),
               "\x1b[H"
               "0123456…\r\n"

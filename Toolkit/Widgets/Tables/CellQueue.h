@@ -13,15 +13,15 @@ namespace velmora {
 
 class TableCell;
 
-/// Cells that wait to stand for another row, by reuse identifier. The last one in is the first one out.
+/// Cells that are queued for reuse, by reuse identifier; last in, first out.
 class CellQueue {
 public:
     void add(std::shared_ptr<TableCell> cell);
     /// Null when none waits.
     [[nodiscard]] std::shared_ptr<TableCell> take(std::string_view identifier);
-    /// Takes those off the screen that still wait.
+    /// Hides the cells that are still queued.
     void hideAll();
-    /// Lets go of all of them, and takes them out of the widget that they are in.
+    /// Releases all of them, and removes them from their widget.
     void clear();
 
 private:

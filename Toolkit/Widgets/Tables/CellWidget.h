@@ -30,7 +30,7 @@ public:
     [[nodiscard]] bool isSelected() const { return _isSelected; }
     [[nodiscard]] bool isHighlighted() const { return _isSelected || _isPressed; }
     [[nodiscard]] bool hasFocusFrame() const { return _hasFocusFrame; }
-    /// Tells a screen reader when the row is called otherwise than when this was last asked.
+    /// Announces the row's name to screen readers if it has changed since the last call.
     void announceName();
 
     /// How much an accessory takes of the cell's width.

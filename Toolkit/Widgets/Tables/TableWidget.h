@@ -35,7 +35,7 @@ public:
     TableViewDelegate* delegate = nullptr;
 
     void reload();
-    /// Loads the rows if nobody has yet.
+    /// Loads the rows if they are not loaded yet.
     void loadOnce();
     [[nodiscard]] std::shared_ptr<TableCell> dequeue(std::string_view identifier);
     void releaseCells();
@@ -56,10 +56,10 @@ public:
     void setPressedRow(std::optional<std::size_t> row);
     /// Scrolls to it and tells a screen reader.
     void setFocusRow(std::optional<std::size_t> row);
-    /// The focus frame shows once the keyboard is used and goes with the next click.
+    /// The focus frame is shown after keyboard use and hidden by the next click.
     void setShowsFocus(bool shows);
     void scrollToRow(std::size_t row);
-    /// Selects the row and tells the delegate, which may destroy the table.
+    /// Selects the row and notifies the delegate, which may destroy the table.
     void choose(std::size_t row);
 
 protected:
