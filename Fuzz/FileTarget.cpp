@@ -3,7 +3,7 @@
 
 #include "Fuzz/FuzzTargets.h"
 #include "Recording/DLF/DLFReader.h"
-#include "Recording/Pcapng/RecordingReader.h"
+#include "Recording/Pcapng/PcapngReader.h"
 #include "Recording/Snapshots/SnapshotReader.h"
 #include "Tests/Recording/PcapngFile.h"
 
@@ -131,7 +131,7 @@ private:
 } // namespace
 
 std::unique_ptr<FuzzTarget> makeRecordingTarget() {
-    return std::make_unique<FileTarget<RecordingReader>>(true);
+    return std::make_unique<FileTarget<PcapngReader>>(true);
 }
 
 std::unique_ptr<FuzzTarget> makeDLFTarget() {

@@ -3,7 +3,7 @@
 
 #include "Recording/DLF/DLFReader.h"
 
-#include "Recording/Files/InputBegin.h"
+#include "Recording/Files/InputStart.h"
 
 namespace velmora {
 
@@ -13,7 +13,7 @@ Result<std::unique_ptr<DLFReader>> DLFReader::open(ChunkedInput input, std::stri
     if (reader->failure() && !isLog)
         return *reader->failure();
     if (!isLog)
-        return Failure{unexpectedBegin(reader->_records.available(), wanted)};
+        return Failure{unexpectedStart(reader->_records.available(), wanted)};
     reader->lookAhead();
     return reader;
 }

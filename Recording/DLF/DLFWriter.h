@@ -6,7 +6,7 @@
 #include "Platform/Bytes.h"
 #include "Platform/Clock.h"
 #include "Platform/Result.h"
-#include "Recording/Files/RecordingFile.h"
+#include "Recording/Files/OutputFile.h"
 
 #include <cstdint>
 #include <memory>
@@ -33,7 +33,7 @@ public:
     /// Writes to an open descriptor, which it takes over; failures name it `name`.
     static Result<std::unique_ptr<DLFWriter>> adopt(int descriptor, std::string name, const Clock& clock);
     /// Writes to any file of which nothing has been written.
-    static Result<std::unique_ptr<DLFWriter>> start(std::unique_ptr<RecordingFile> file, std::string name,
+    static Result<std::unique_ptr<DLFWriter>> start(std::unique_ptr<OutputFile> file, std::string name,
                                                     const Clock& clock);
 
     ~DLFWriter();
@@ -54,12 +54,12 @@ public:
     [[nodiscard]] bool hasFailed() const { return _failure.has_value(); }
 
 private:
-    DLFWriter(std::unique_ptr<RecordingFile> file, std::string name);
+    DLFWriter(std::unique_ptr<OutputFile> file, std::string name);
 
     Result<Done> flush();
     [[nodiscard]] Failure failureOf(const char* operation, int error) const;
 
-    std::unique_ptr<RecordingFile> _file; ///< null when closed
+    std::unique_ptr<OutputFile> _file; ///< null when closed
     std::string _name;
     std::vector<std::uint8_t> _buffer; ///< whole records
     std::uint64_t _messages = 0;

@@ -41,7 +41,7 @@ DescriptorFile::~DescriptorFile() {
     close();
 }
 
-RecordingFile::Written DescriptorFile::write(Bytes bytes) {
+OutputFile::Written DescriptorFile::write(Bytes bytes) {
     for (;;) {
         const ssize_t count = ::write(_descriptor, bytes.data(), bytes.size());
         if (count >= 0)

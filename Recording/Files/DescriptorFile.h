@@ -3,7 +3,7 @@
 
 #pragma once
 
-#include "Recording/Files/RecordingFile.h"
+#include "Recording/Files/OutputFile.h"
 
 #include <future>
 
@@ -11,7 +11,7 @@ namespace velmora {
 
 /// An open file descriptor that a recording is written to. A sync to storage may take seconds: `startSync`
 /// waits for it on a separate thread, which does nothing else. Main thread only.
-class DescriptorFile final : public RecordingFile {
+class DescriptorFile final : public OutputFile {
 public:
     /// Writes at the descriptor's current position. Closes it on destruction when `owned`.
     DescriptorFile(int descriptor, bool owned);

@@ -3,8 +3,8 @@
 
 #include "Recording/Pcapng/BlockReader.h"
 
-#include "Recording/Files/InputBegin.h"
-#include "Recording/Pcapng/FieldReader.h"
+#include "Recording/Files/InputStart.h"
+#include "Recording/Pcapng/ByteReader.h"
 #include "Recording/Pcapng/Pcapng.h"
 
 #include <algorithm>
@@ -56,8 +56,8 @@ Result<Done> BlockReader::expectSection() {
     if (_input.failure())
         return *_input.failure();
     Block block;
-    if (!whole || FieldReader(begin, false).u32(0) != SectionHeader || examine(block) == Fault::NoByteOrder)
-        return Failure{unexpectedBegin(begin, "a pcapng section header")};
+    if (!whole || ByteReader(begin, false).u32(0) != SectionHeader || examine(block) == Fault::NoByteOrder)
+        return Failure{unexpectedStart(begin, "a pcapng section header")};
     return Done{};
 }
 
@@ -83,20 +83,20 @@ BlockReader::Fault BlockReader::examine(Block& block) {
         return Fault::CutOff;
     const Bytes header = _input.available();
     block.bigEndian = _bigEndian;
-    block.type = FieldReader(header, _bigEndian).u32(0);
+    block.type = ByteReader(header, _bigEndian).u32(0);
     if (block.type == SectionHeader) {
         const Bytes magic = header.subspan(magicOffset);
         block.bigEndian = startsWith(magic, bigEndianMagic);
         if (!block.bigEndian && !startsWith(magic, littleEndianMagic))
             return Fault::NoByteOrder;
     }
-    block.length = FieldReader(header, block.bigEndian).u32(4);
+    block.length = ByteReader(header, block.bigEndian).u32(4);
     if (block.length < pcapng::blockOverhead || block.length % 4 != 0 || block.length > maximumBlockSize)
         return Fault::Length;
     if (!_input.ensure(block.length))
         return Fault::CutOff;
     block.bytes = _input.available().first(block.length);
-    if (FieldReader(block.bytes, block.bigEndian).u32(block.length - 4) != block.length)
+    if (ByteReader(block.bytes, block.bigEndian).u32(block.length - 4) != block.length)
         return Fault::TrailingLength;
     return Fault::None;
 }
@@ -114,7 +114,7 @@ std::string BlockReader::describe(Fault fault, const Block& block) const {
                std::to_string(pcapng::blockOverhead) + " to " + std::to_string(maximumBlockSize);
     case Fault::TrailingLength:
         return "trailing block length " +
-               std::to_string(FieldReader(block.bytes, block.bigEndian).u32(block.length - 4)) + ", wanted " +
+               std::to_string(ByteReader(block.bytes, block.bigEndian).u32(block.length - 4)) + ", wanted " +
                std::to_string(block.length);
     }
     return {};
@@ -143,12 +143,12 @@ bool BlockReader::standsAtBlock() {
     if (!_input.ensure(pcapng::blockOverhead))
         return false;
     const Bytes header = _input.available();
-    const std::uint32_t type = FieldReader(header, _bigEndian).u32(0);
+    const std::uint32_t type = ByteReader(header, _bigEndian).u32(0);
     Block block;
     // The cheap tests come first: this is called for every word of what may be much input.
     if (leastLength(type) > maximumBlockSize)
         return false;
-    if (type != SectionHeader && FieldReader(header, _bigEndian).u32(4) < leastLength(type))
+    if (type != SectionHeader && ByteReader(header, _bigEndian).u32(4) < leastLength(type))
         return false;
     return examine(block) == Fault::None && block.length >= leastLength(type);
 }

@@ -3,7 +3,7 @@
 
 #include "Recording/Pcapng/InterfaceDescription.h"
 
-#include "Recording/Pcapng/FieldReader.h"
+#include "Recording/Pcapng/ByteReader.h"
 #include "Recording/Pcapng/Pcapng.h"
 
 #include <algorithm>
@@ -37,7 +37,7 @@ Wide nanoseconds(std::uint64_t stamp, std::uint8_t resolution) {
 } // namespace
 
 std::optional<InterfaceDescription> InterfaceDescription::read(Bytes body, bool bigEndian) {
-    FieldReader fields(body, bigEndian);
+    ByteReader fields(body, bigEndian);
     InterfaceDescription description;
     description.linkType = fields.u16(0);
     description.snapLength = fields.u32(4);

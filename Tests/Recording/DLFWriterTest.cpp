@@ -42,7 +42,7 @@ protected:
 
     FakeClock _clock;
     FakeResources _resources;
-    FakeMedium _medium;
+    FakeOutputFile _medium;
 };
 
 TEST_F(DLFWriterTest, beginsWithTheVersionReport) {
@@ -75,7 +75,7 @@ TEST_F(DLFWriterTest, takesTheTypeByteOfRecordsThatTellItByTheirCode) {
         {"prefixed", "8171 01 0D00 2C51 0000000000000000 05", "8171010D002C51000000000000000005"},
     };
     for (const Case& each : cases) {
-        _medium = FakeMedium();
+        _medium = FakeOutputFile();
         const auto writer = make();
         EXPECT_TRUE(writer->append(hex(each.message).bytes())) << each.name;
         EXPECT_TRUE(writer->close()) << each.name;
@@ -186,7 +186,7 @@ TEST_F(DLFWriterTest, tellsWhatTheMediumSaysInTheEnd) {
         {"a pipe that is not closed", false, EIO, EIO, "cannot close drive.dlf: Input/output error"},
     };
     for (const Case& each : cases) {
-        _medium = FakeMedium();
+        _medium = FakeOutputFile();
         _medium.isRegular = each.isRegular;
         _medium.syncError = each.syncError;
         _medium.closeError = each.closeError;

@@ -3,7 +3,7 @@
 
 #pragma once
 
-#include "Recording/Files/RecordingFile.h"
+#include "Recording/Files/OutputFile.h"
 
 #include <algorithm>
 #include <cerrno>
@@ -16,7 +16,7 @@
 namespace velmora {
 
 /// A disk as a test wants it. It outlives the file that the writer has of it.
-struct FakeMedium {
+struct FakeOutputFile {
     std::vector<std::uint8_t> content;
     std::size_t room = SIZE_MAX; ///< how much the file may hold; a write that finds some room takes it
     int fullError = ENOSPC;      ///< what a write gives that finds none
@@ -32,9 +32,9 @@ struct FakeMedium {
     int closeError = 0;
 };
 
-class FakeRecordingFile final : public RecordingFile {
+class FakeRecordingFile final : public OutputFile {
 public:
-    explicit FakeRecordingFile(FakeMedium& medium) : _medium(medium) {}
+    explicit FakeRecordingFile(FakeOutputFile& medium) : _medium(medium) {}
 
     Written write(Bytes bytes) override {
         const std::size_t left = _medium.room - std::min(_medium.room, _medium.content.size());
@@ -70,7 +70,7 @@ public:
     }
 
 private:
-    FakeMedium& _medium;
+    FakeOutputFile& _medium;
 };
 
 } // namespace velmora

@@ -4,8 +4,8 @@
 #include "Recording/OpenMessages.h"
 
 #include "Recording/Files/FileSource.h"
-#include "Recording/Pcapng/RecordingReader.h"
-#include "Recording/Pcapng/RecordingWriter.h"
+#include "Recording/Pcapng/PcapngReader.h"
+#include "Recording/Pcapng/PcapngWriter.h"
 #include "Tests/Recording/LogFile.h"
 #include "Tests/Recording/PcapngFile.h"
 #include "Tests/Support/TemporaryDirectory.h"
@@ -83,7 +83,7 @@ TEST_F(OpenMessages, readsStandardInputThroughAPipe) {
 TEST_F(OpenMessages, givesMessagesOfAPipeAsSoonAsTheyAreWhole) {
     int ends[2];
     ASSERT_EQ(::pipe(ends), 0);
-    auto writer = RecordingWriter::adopt(ends[1], "pipe", "Ostrel_LTE");
+    auto writer = PcapngWriter::adopt(ends[1], "pipe", "Ostrel_LTE");
     ASSERT_TRUE(writer);
     auto reader = openMessages("/dev/fd/" + std::to_string(ends[0]));
     ASSERT_TRUE(reader) << reader.reason();
@@ -107,12 +107,12 @@ TEST_F(OpenMessages, waitsWherePipesDoNotBlock) {
     const std::vector<std::uint8_t> message(1'000, 0x5A);
     // Far more than a pipe holds: each side finds it full or empty at times.
     std::thread other([&] {
-        auto writer = RecordingWriter::adopt(ends[1], "pipe", "Ostrel_LTE");
+        auto writer = PcapngWriter::adopt(ends[1], "pipe", "Ostrel_LTE");
         for (int i = 0; i < count; ++i)
             EXPECT_TRUE((*writer)->append(Time(std::chrono::nanoseconds(i)), message));
         EXPECT_TRUE((*writer)->close());
     });
-    auto reader = RecordingReader::open(ChunkedInput(std::make_unique<FileSource>(ends[0], true)));
+    auto reader = PcapngReader::open(ChunkedInput(std::make_unique<FileSource>(ends[0], true)));
     EXPECT_TRUE(reader);
     int messages = 0;
     while (const auto next = (*reader)->next()) {

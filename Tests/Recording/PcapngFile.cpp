@@ -90,7 +90,7 @@ std::string describe(const Loss& loss) {
 
 ReadOut readOut(const Data& file, std::size_t piece, std::size_t good) {
     ReadOut out;
-    auto reader = RecordingReader::open(ChunkedInput(std::make_unique<MemorySource>(file, piece, good)));
+    auto reader = PcapngReader::open(ChunkedInput(std::make_unique<MemorySource>(file, piece, good)));
     if (!reader) {
         out.failure = reader.reason();
         return out;

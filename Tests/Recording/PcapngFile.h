@@ -3,7 +3,7 @@
 
 #pragma once
 
-#include "Recording/Pcapng/RecordingReader.h"
+#include "Recording/Pcapng/PcapngReader.h"
 #include "Tests/Support/Hex.h"
 
 #include <cstdint>
@@ -68,7 +68,7 @@ struct ReadOut {
     std::vector<std::string> messages; ///< "1 at 76, 5 ns: 0A0B"
     std::vector<std::string> losses; ///< "at 76, 36 bytes, record 1: reason", with ", tail" before the colon
     std::string failure;             ///< of opening or of reading
-    RecordingReader::PassedOver passedOver;
+    PcapngReader::PassedOver passedOver;
 };
 
 [[nodiscard]] std::string hexText(Bytes bytes);

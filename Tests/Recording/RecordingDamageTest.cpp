@@ -236,7 +236,7 @@ TEST(RecordingDamage, ofAnyKindKeepsMessagesAndLossesInOrderAndApart) {
                 std::fill_n(place, length, static_cast<std::uint8_t>(random()));
         }
         const Data data = file.data();
-        auto reader = RecordingReader::open(ChunkedInput(std::make_unique<MemorySource>(data, 100), 8192));
+        auto reader = PcapngReader::open(ChunkedInput(std::make_unique<MemorySource>(data, 100), 8192));
         ASSERT_TRUE(reader) << reader.reason();
         std::uint64_t number = 0;
         std::uint64_t end = 0;

@@ -83,7 +83,7 @@ TEST_F(RecordingSyncTest, FileThatIsNotClosedIsToldUnlessThereWasTroubleBefore) 
     EXPECT_EQ(reasonOf(writer->close()), "cannot close the recording: Input/output error");
     EXPECT_THAT(numbers(), ElementsAre(1));
 
-    medium = FakeMedium();
+    medium = FakeOutputFile();
     start();
     ASSERT_TRUE(append(1));
     medium.room = headSize;

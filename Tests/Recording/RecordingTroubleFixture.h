@@ -3,8 +3,8 @@
 
 #pragma once
 
-#include "Recording/Pcapng/RecordingReader.h"
-#include "Recording/Pcapng/RecordingWriter.h"
+#include "Recording/Pcapng/PcapngReader.h"
+#include "Recording/Pcapng/PcapngWriter.h"
 #include "Tests/Recording/FakeRecordingFile.h"
 #include "Tests/Recording/PcapngFile.h"
 
@@ -28,8 +28,8 @@ inline const std::string broken = "cannot write the recording: Input/output erro
 class RecordingTroubleFixture : public testing::Test {
 protected:
     void start() {
-        auto started = RecordingWriter::start(std::make_unique<FakeRecordingFile>(medium), "the recording",
-                                              "Ostrel_GSM");
+        auto started =
+            PcapngWriter::start(std::make_unique<FakeRecordingFile>(medium), "the recording", "Ostrel_GSM");
         ASSERT_TRUE(started) << started.reason();
         writer = *std::move(started);
     }
@@ -39,7 +39,7 @@ protected:
     /// The numbers of the messages on the disk, which must be whole.
     [[nodiscard]] std::vector<int> numbers() const {
         const auto reader =
-            RecordingReader::open(ChunkedInput(std::make_unique<MemorySource>(Data::copyOf(medium.content))));
+            PcapngReader::open(ChunkedInput(std::make_unique<MemorySource>(Data::copyOf(medium.content))));
         if (!reader) {
             ADD_FAILURE() << reader.reason();
             return {};
@@ -52,8 +52,8 @@ protected:
     }
     static std::string reasonOf(const Result<Done>& result) { return result ? "success" : result.reason(); }
 
-    FakeMedium medium;
-    std::unique_ptr<RecordingWriter> writer;
+    FakeOutputFile medium;
+    std::unique_ptr<PcapngWriter> writer;
 };
 
 } // namespace velmora

@@ -3,7 +3,7 @@
 
 #include "Tests/Recordings/ExampleRecording.h"
 
-#include "Recording/Pcapng/RecordingWriter.h"
+#include "Recording/Pcapng/PcapngWriter.h"
 #include "Telephony/Drives/DriveScenario.h"
 
 #include <chrono>
@@ -103,7 +103,7 @@ void ExampleRecording::eachMessage(const std::function<void(Time, const Data&)>&
 }
 
 Result<Done> ExampleRecording::write(const std::string& path) const {
-    const auto writer = RecordingWriter::create(path, makeScenario()->technology());
+    const auto writer = PcapngWriter::create(path, makeScenario()->technology());
     if (!writer)
         return Failure{writer.reason()};
     Result<Done> written = Done{};

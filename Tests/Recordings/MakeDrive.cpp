@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Recording/Pcapng/RecordingWriter.h"
+#include "Recording/Pcapng/PcapngWriter.h"
 #include "Telephony/Drives/DriveScenario.h"
 #include "Telephony/Drives/ScenarioRegistry.h"
 
@@ -49,7 +49,7 @@ std::optional<Length> lengthOf(std::string_view text) {
 }
 
 Result<Done> make(Scenario& scenario, const Length& length, const std::string& path) {
-    Result<std::unique_ptr<RecordingWriter>> writer = RecordingWriter::create(path, scenario.technology());
+    Result<std::unique_ptr<PcapngWriter>> writer = PcapngWriter::create(path, scenario.technology());
     if (!writer)
         return Failure{writer.reason()};
     for (std::uint64_t i = 0; i < length.messages; ++i) {

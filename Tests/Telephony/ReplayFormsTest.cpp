@@ -9,7 +9,7 @@
 #include "Recording/DLF/DLFWriter.h"
 #include "Recording/Files/DataSource.h"
 #include "Recording/OpenMessages.h"
-#include "Recording/Pcapng/RecordingWriter.h"
+#include "Recording/Pcapng/PcapngWriter.h"
 #include "Telephony/Drives/ScenarioRegistry.h"
 #include "Tests/Support/FakeClock.h"
 #include "Tests/Support/Hex.h"
@@ -35,7 +35,7 @@ using ReplayFormsTest = ReplayFormsFixture;
 
 TEST_P(ReplayFormsTest, recording) {
     const std::string path = (directory / "drive.pcapng").string();
-    const auto writer = RecordingWriter::create(path, technology);
+    const auto writer = PcapngWriter::create(path, technology);
     ASSERT_TRUE(writer);
     std::vector<Data> messages;
     for (const ScenarioEvent& event : drive) {

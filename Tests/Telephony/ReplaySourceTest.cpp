@@ -3,7 +3,7 @@
 
 #include "Telephony/Sources/ReplaySource.h"
 
-#include "Recording/Pcapng/RecordingWriter.h"
+#include "Recording/Pcapng/PcapngWriter.h"
 #include "Telephony/Sources/SourceFactory.h"
 #include "Tests/Support/CapturedLog.h"
 #include "Tests/Support/FakeMainQueue.h"
@@ -258,7 +258,7 @@ TEST_F(ReplaySourceTest, theFactoryRefusesWhatCannotBeRead) {
 TEST_F(ReplaySourceTest, theFactoryPlaysARecording) {
     const TemporaryDirectory directory;
     const std::string path = (directory / "drive.pcapng").string();
-    const auto writer = RecordingWriter::create(path, "Ostrel_LTE");
+    const auto writer = PcapngWriter::create(path, "Ostrel_LTE");
     ASSERT_TRUE(writer);
     ASSERT_TRUE((*writer)->append(FakeClock::defaultNow(), record(0xB0E5, "01 02").bytes()));
     ASSERT_TRUE((*writer)->append(FakeClock::defaultNow() + 3s, hex("01 02 03").bytes()));

@@ -3,7 +3,7 @@
 
 #include "Tests/Telephony/TelephonydProcess.h"
 
-#include "Recording/Pcapng/RecordingWriter.h"
+#include "Recording/Pcapng/PcapngWriter.h"
 #include "Telephony/Drives/GSM/GSMScenario.h"
 #include "Tests/Support/FakeClock.h"
 #include "Tests/Support/Hex.h"
@@ -139,7 +139,7 @@ TEST_F(TelephonydTest, replaysAFileAsFastAsItsClientTakesItAndLosesNothing) {
     constexpr int count = 50'000;
     const std::string path = (directory / "drive.pcapng").string();
     std::vector<Data> wanted;
-    const auto writer = RecordingWriter::create(path, "Ostrel_LTE");
+    const auto writer = PcapngWriter::create(path, "Ostrel_LTE");
     ASSERT_TRUE(writer);
     for (int i = 0; i < count; ++i) {
         std::vector<std::uint8_t> payload(40);

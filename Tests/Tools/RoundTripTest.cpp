@@ -14,7 +14,7 @@
 #include "Tests/Tools/FakeLogService.h"
 #include "Tests/Tools/ToolFixture.h"
 #include "Tools/Decode/Decoding.h"
-#include "Tools/Decode/RecordedTime.h"
+#include "Tools/Decode/RefreshTicks.h"
 #include "Tools/Report.h"
 
 #include <gmock/gmock.h>
@@ -138,7 +138,7 @@ TEST_P(RoundTripTest, SnapshotShowsTheLastFiveRefreshes) {
         Time tick;
     };
     std::vector<Refresh> refreshes(1);
-    RecordedTicks ticks;
+    RefreshTicks ticks;
     for (const TimedMessage& message : _drive) {
         if (const auto tick = ticks.before(message.time)) {
             refreshes.back().tick = *tick;

@@ -9,9 +9,9 @@
 #include "Platform/TelephonyService.h"
 #include "PropertyLists/PropertyList.h"
 #include "Recording/DLF/DLFWriter.h"
-#include "Recording/Pcapng/RecordingWriter.h"
+#include "Recording/Pcapng/PcapngWriter.h"
 #include "Tools/Decode/Decoding.h"
-#include "Tools/Decode/RecordedTime.h"
+#include "Tools/Decode/RefreshTicks.h"
 #include "Tools/Report.h"
 #include "Tools/Technologies.h"
 
@@ -58,7 +58,7 @@ Result<bool> toRecording(MessageReader& reader, const Conversion& conversion, in
     const Result<int> own = ownDescriptor(descriptor, conversion.name);
     if (!own)
         return Failure{own.reason()};
-    const auto writer = RecordingWriter::adopt(*own, conversion.name, messages->technology);
+    const auto writer = PcapngWriter::adopt(*own, conversion.name, messages->technology);
     if (!writer)
         return Failure{writer.reason()};
     for (; messages->next; messages->advance())
@@ -81,7 +81,7 @@ Result<bool> toDLFLog(MessageReader& reader, const Conversion& conversion, int d
     if (!own)
         return Failure{own.reason()};
     // The log's own time is that of its first record, so that the same messages make the same log.
-    RecordedClock clock;
+    MessageClock clock;
     if (messages->next)
         clock.setNow(messages->next->time);
     const auto writer = DLFWriter::adopt(*own, conversion.name, clock);

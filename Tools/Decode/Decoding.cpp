@@ -6,7 +6,7 @@
 #include "Platform/TelephonyService.h"
 #include "Tools/Decode/DecodeProgress.h"
 #include "Tools/Decode/NotedResources.h"
-#include "Tools/Decode/RecordedTime.h"
+#include "Tools/Decode/RefreshTicks.h"
 #include "Tools/Decode/Refreshes.h"
 #include "Tools/Report.h"
 #include "Tools/Technologies.h"
@@ -21,7 +21,7 @@ Result<Decoded> decodeMessages(MessageReader& reader, const DecodingRequest& req
     // The first message before the technology: a file may name it no earlier than there.
     std::optional<LoggedMessage> message = reader.next();
     const std::string& named = request.technology.empty() ? reader.technology() : request.technology;
-    RecordedClock clock;
+    MessageClock clock;
     const Result<std::unique_ptr<LogGenerator>> decoder = makeDecoder(named, clock);
     if (!decoder)
         return Failure{decoder.reason() + (named.empty() ? "; --technology supplies it" : "")};

@@ -5,7 +5,7 @@
 
 #include "Platform/Clock.h"
 #include "Recording/MessageReader.h"
-#include "Tools/Decode/RecordedTime.h"
+#include "Tools/Decode/RefreshTicks.h"
 
 #include <cstdint>
 #include <optional>
@@ -13,7 +13,7 @@
 namespace velmora {
 
 /// When a file's display is refreshed while its messages are decoded one after the other: on the grid of
-/// RecordedTicks, or where the file itself says when (a snapshot does).
+/// RefreshTicks, or where the file itself says when (a snapshot does).
 class Refreshes {
 public:
     /// The refresh that is due before this message is decoded, if any.
@@ -43,7 +43,7 @@ public:
     [[nodiscard]] std::uint64_t count() const { return _count; }
 
 private:
-    RecordedTicks _ticks;
+    RefreshTicks _ticks;
     bool _fileTells = false; ///< and then its refreshes are all there are
     bool _isPending = false; ///< a message has been decoded since the last refresh
     std::uint64_t _count = 0;

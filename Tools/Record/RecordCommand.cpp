@@ -17,7 +17,7 @@ namespace {
 
 /// Reports what has been recorded, and what has not. Returns the exit status.
 int sumUp(const RecordingSession& recording, const std::string& file, int status) {
-    const recordingBlocks::PacketCount unsaved = recording.unsaved();
+    const pcapngBlocks::PacketCount unsaved = recording.unsaved();
     report("recorded " + std::to_string(recording.messages() - unsaved.messages) + " messages of " +
            recording.technology() + ", " + std::to_string(recording.bytes() - unsaved.bytes) + " bytes");
     const std::uint64_t missing = unsaved.messages + recording.dropped();

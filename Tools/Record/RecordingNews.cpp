@@ -16,7 +16,7 @@ namespace velmora {
 namespace {
 
 std::string queueSize() {
-    return std::to_string(RecordingWriter::maximumQueue >> 20) + " MiB";
+    return std::to_string(PcapngWriter::maximumQueue >> 20) + " MiB";
 }
 
 } // namespace

@@ -87,8 +87,8 @@ Result<Done> RecordingSession::learnTechnology(std::string_view technology) {
     const int copy = _path == "-" ? -1 : ::fcntl(descriptor, F_DUPFD_CLOEXEC, 0);
     if (_path != "-" && copy < 0)
         return Failure{"cannot write " + _path + ": " + std::generic_category().message(errno)};
-    Result<std::unique_ptr<RecordingWriter>> writer =
-        _path == "-" ? RecordingWriter::create(_path, name) : RecordingWriter::adopt(copy, _path, name);
+    Result<std::unique_ptr<PcapngWriter>> writer =
+        _path == "-" ? PcapngWriter::create(_path, name) : PcapngWriter::adopt(copy, _path, name);
     _file.reset();
     if (!writer)
         return Failure{writer.reason()};

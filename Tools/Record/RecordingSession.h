@@ -6,7 +6,7 @@
 #include "Platform/Clock.h"
 #include "Platform/Linux/Files/FileDescriptor.h"
 #include "Platform/Result.h"
-#include "Recording/Pcapng/RecordingWriter.h"
+#include "Recording/Pcapng/PcapngWriter.h"
 
 #include <cstdint>
 #include <memory>
@@ -48,8 +48,8 @@ public:
     /// The bytes of these.
     [[nodiscard]] std::uint64_t bytes() const { return _bytes; }
     /// Those of these that are not in the file.
-    [[nodiscard]] recordingBlocks::PacketCount unsaved() const {
-        return _writer ? _writer->unsaved() : recordingBlocks::PacketCount();
+    [[nodiscard]] pcapngBlocks::PacketCount unsaved() const {
+        return _writer ? _writer->unsaved() : pcapngBlocks::PacketCount();
     }
     /// Messages dropped while the file could not be written.
     [[nodiscard]] std::uint64_t dropped() const { return _writer ? _writer->droppedMessages() : 0; }
@@ -72,7 +72,7 @@ private:
     std::string _path;
     FileDescriptor _file;  ///< until the writer has it
     bool _created = false; ///< this created the file
-    std::unique_ptr<RecordingWriter> _writer;
+    std::unique_ptr<PcapngWriter> _writer;
     std::string _technology;
     std::string _trouble;
     std::uint64_t _bytes = 0;

@@ -1,14 +1,14 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Tools/Decode/RecordedTime.h"
+#include "Tools/Decode/RefreshTicks.h"
 
 #include <cstdint>
 
 namespace velmora {
 
 /// Precondition: this is the first message, or the next tick is not after it.
-std::optional<Time> RecordedTicks::reach(Time message) {
+std::optional<Time> RefreshTicks::reach(Time message) {
     if (!_started) {
         _started = true;
         _next = message;
@@ -22,14 +22,14 @@ std::optional<Time> RecordedTicks::reach(Time message) {
     return tick;
 }
 
-std::optional<Time> RecordedTicks::last() const {
+std::optional<Time> RefreshTicks::last() const {
     if (!_started)
         return std::nullopt;
     return _next;
 }
 
 /// Precondition: `_next` is not after the message.
-void RecordedTicks::advancePast(Time message) {
+void RefreshTicks::advancePast(Time message) {
     // Unsigned, since the span between two moments may be more than a signed 64-bit count of nanoseconds
     // holds.
     const auto distance = [](Time from, Time to) {

@@ -13,9 +13,9 @@ namespace velmora {
 
 /// Reads numbers of one byte order out of bytes that it does not own, never past their end: such a read
 /// returns 0, and `isGood` is false from then on. Check it before using what was read.
-class FieldReader {
+class ByteReader {
 public:
-    FieldReader(Bytes bytes, bool bigEndian) : _bytes(bytes), _bigEndian(bigEndian) {}
+    ByteReader(Bytes bytes, bool bigEndian) : _bytes(bytes), _bigEndian(bigEndian) {}
 
     [[nodiscard]] std::uint16_t u16(std::size_t offset) { return number<std::uint16_t>(offset); }
     [[nodiscard]] std::uint32_t u32(std::size_t offset) { return number<std::uint32_t>(offset); }

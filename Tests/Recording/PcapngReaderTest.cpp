@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Recording/Pcapng/RecordingReader.h"
+#include "Recording/Pcapng/PcapngReader.h"
 
 #include "Tests/Recording/PcapngFile.h"
 
@@ -26,7 +26,7 @@ constexpr const char* bigEndianHead = R"(
         0000 0000
     00000030)";
 
-TEST(RecordingReader, readsBigEndianRecordings) {
+TEST(PcapngReader, readsBigEndianRecordings) {
     const ReadOut out = readOut(joined(hex(bigEndianHead), hex(R"(
         00000006 00000024 00000000 00000001 00000002 00000004 00000004 01020304 00000024
         00000003 00000014 00000001 AA000000 00000014
@@ -37,20 +37,20 @@ TEST(RecordingReader, readsBigEndianRecordings) {
     EXPECT_EQ(out.technology, "Ostrel_GSM");
 }
 
-TEST(RecordingReader, knowsTheTechnologyBeforeTheFirstMessage) {
-    auto reader = RecordingReader::open(
+TEST(PcapngReader, knowsTheTechnologyBeforeTheFirstMessage) {
+    auto reader = PcapngReader::open(
         ChunkedInput(std::make_unique<MemorySource>(PcapngFile().head().message(1, {}).data())));
     ASSERT_TRUE(reader);
     EXPECT_EQ((*reader)->technology(), "Ostrel_GSM");
 }
 
-TEST(RecordingReader, takesTheServicesConstantForTheShortName) {
+TEST(PcapngReader, takesTheServicesConstantForTheShortName) {
     const ReadOut out =
         readOut(PcapngFile().section().messageInterface("kVoxLogChannelTechnology_Ostrel_LTE").data());
     EXPECT_EQ(out.technology, "Ostrel_LTE");
 }
 
-TEST(RecordingReader, leavesTheTechnologyOpenWhereNoInterfaceIsNamed) {
+TEST(PcapngReader, leavesTheTechnologyOpenWhereNoInterfaceIsNamed) {
     const ReadOut out =
         readOut(PcapngFile().section().messageInterface("").message(1, hex("AA").bytes()).data());
     EXPECT_EQ(out.technology, "");
@@ -58,7 +58,7 @@ TEST(RecordingReader, leavesTheTechnologyOpenWhereNoInterfaceIsNamed) {
     EXPECT_THAT(out.losses, IsEmpty());
 }
 
-TEST(RecordingReader, takesTheFirstTechnologyNamedAndLosesTheOthers) {
+TEST(PcapngReader, takesTheFirstTechnologyNamedAndLosesTheOthers) {
     PcapngFile file;
     file.section().messageInterface("").messageInterface("Ostrel_LTE").messageInterface("Ostrel_GSM");
     file.messageInterface("Ostrel_LTE");
@@ -73,7 +73,7 @@ TEST(RecordingReader, takesTheFirstTechnologyNamedAndLosesTheOthers) {
         ElementsAre("at 276, 36 bytes, record 3: message of Ostrel_GSM in a recording of Ostrel_LTE"));
 }
 
-TEST(RecordingReader, passesOverInterfacesOfOtherLinkTypes) {
+TEST(PcapngReader, passesOverInterfacesOfOtherLinkTypes) {
     PcapngFile file;
     file.section().interface(1).message(1, hex("AA").bytes()).messageInterface("Ostrel_LTE");
     file.message(2, hex("BB").bytes(), 1).message(3, hex("CC").bytes(), 0);
@@ -85,7 +85,7 @@ TEST(RecordingReader, passesOverInterfacesOfOtherLinkTypes) {
     EXPECT_EQ(out.passedOver.packets, 2U);
 }
 
-TEST(RecordingReader, losesInterfacesAboveTheirBound) {
+TEST(PcapngReader, losesInterfacesAboveTheirBound) {
     PcapngFile file;
     file.head(); // the first interface
     for (int i = 1; i < 65'536; ++i)
@@ -98,7 +98,7 @@ TEST(RecordingReader, losesInterfacesAboveTheirBound) {
     EXPECT_EQ(out.passedOver.interfaces, 65'535u);
 }
 
-TEST(RecordingReader, cutsSimplePacketsAtTheSnapshotLength) {
+TEST(PcapngReader, cutsSimplePacketsAtTheSnapshotLength) {
     PcapngFile file;
     file.section().interface(147, {}, 4);
     file.block(3, hex("04000000 01020304").bytes()).block(3, hex("06000000 01020304").bytes());
@@ -108,12 +108,12 @@ TEST(RecordingReader, cutsSimplePacketsAtTheSnapshotLength) {
                                         "4 of 6 bytes"));
 }
 
-TEST(RecordingReader, countsMicrosecondsWhereTheResolutionIsNotGiven) {
+TEST(PcapngReader, countsMicrosecondsWhereTheResolutionIsNotGiven) {
     const ReadOut out = readOut(PcapngFile().section().interface(147).message(3, hex("AA").bytes()).data());
     EXPECT_THAT(out.messages, ElementsAre("1 at 48, 3000 ns: AA"));
 }
 
-TEST(RecordingReader, losesMessagesAbove16MiB) {
+TEST(PcapngReader, losesMessagesAbove16MiB) {
     PcapngFile file;
     file.head().message(1, std::vector<std::uint8_t>(16'777'217)).message(2, hex("AA").bytes());
     const ReadOut out = readOut(file.data());
@@ -123,12 +123,12 @@ TEST(RecordingReader, losesMessagesAbove16MiB) {
     EXPECT_THAT(out.messages, ElementsAre("2 at 16777328, 2 ns: AA"));
 }
 
-TEST(RecordingReader, keepsTheFirstHundredLossesAndCountsAll) {
+TEST(PcapngReader, keepsTheFirstHundredLossesAndCountsAll) {
     PcapngFile file;
     file.head();
     for (std::uint64_t i = 0; i < 250; ++i)
         file.message(i, hex("AA").bytes(), 9);
-    auto reader = RecordingReader::open(ChunkedInput(std::make_unique<MemorySource>(file.data())));
+    auto reader = PcapngReader::open(ChunkedInput(std::make_unique<MemorySource>(file.data())));
     ASSERT_TRUE(reader);
     EXPECT_FALSE((*reader)->next());
     ASSERT_EQ((*reader)->losses().size(), 100U);
@@ -137,13 +137,13 @@ TEST(RecordingReader, keepsTheFirstHundredLossesAndCountsAll) {
     EXPECT_EQ((*reader)->lossTotals().bytes, 250U * 36U);
 }
 
-TEST(RecordingReader, opensNoFileThatIsNotThere) {
-    const auto none = RecordingReader::open("none.pcapng");
+TEST(PcapngReader, opensNoFileThatIsNotThere) {
+    const auto none = PcapngReader::open("none.pcapng");
     ASSERT_FALSE(none);
     EXPECT_EQ(none.reason(), "cannot open: No such file or directory");
 }
 
-TEST(RecordingReader, tellsAReadErrorApartFromTheEnd) {
+TEST(PcapngReader, tellsAReadErrorApartFromTheEnd) {
     const Data file = PcapngFile().head().message(1, hex("AA").bytes()).message(2, hex("BB").bytes()).data();
     const ReadOut between = readOut(file, SIZE_MAX, 112);
     EXPECT_THAT(between.messages, ElementsAre("1 at 76, 1 ns: AA"));
@@ -160,14 +160,14 @@ TEST(RecordingReader, tellsAReadErrorApartFromTheEnd) {
     EXPECT_EQ(atOnce.failure, "cannot read: Input/output error at offset 0");
 }
 
-TEST(RecordingReader, givesMessagesThatOutliveIt) {
+TEST(PcapngReader, givesMessagesThatOutliveIt) {
     PcapngFile file;
     file.head();
     for (std::uint32_t i = 0; i < 5'000; ++i)
         file.message(i, file.number(i, 4).bytes());
     std::vector<Data> held;
     {
-        auto reader = RecordingReader::open(ChunkedInput(std::make_unique<MemorySource>(file.data()), 8192));
+        auto reader = PcapngReader::open(ChunkedInput(std::make_unique<MemorySource>(file.data()), 8192));
         ASSERT_TRUE(reader);
         while (auto message = (*reader)->next())
             held.push_back(message->message);

@@ -1,10 +1,10 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Recording/Pcapng/RecordingWriter.h"
+#include "Recording/Pcapng/PcapngWriter.h"
 
 #include "Recording/MessageReader.h"
-#include "Recording/Pcapng/RecordingReader.h"
+#include "Recording/Pcapng/PcapngReader.h"
 #include "Tests/Recording/PcapngFile.h"
 #include "Tests/Support/TemporaryDirectory.h"
 
@@ -28,15 +28,15 @@ Time at(std::int64_t nanoseconds) {
     return Time(std::chrono::nanoseconds(nanoseconds));
 }
 
-class RecordingWriterFiles : public testing::Test {
+class PcapngWriterFiles : public testing::Test {
 protected:
     [[nodiscard]] std::string content() const {
         std::ifstream file(_path, std::ios::binary);
         const std::vector<std::uint8_t> bytes((std::istreambuf_iterator<char>(file)), {});
         return hexText(bytes);
     }
-    [[nodiscard]] std::unique_ptr<RecordingWriter> create(std::string_view technology = "Ostrel_GSM") const {
-        auto writer = RecordingWriter::create(_path, technology);
+    [[nodiscard]] std::unique_ptr<PcapngWriter> create(std::string_view technology = "Ostrel_GSM") const {
+        auto writer = PcapngWriter::create(_path, technology);
         EXPECT_TRUE(writer) << writer.reason();
         return *std::move(writer);
     }
@@ -79,7 +79,7 @@ std::string headHex() {
            sectionEndHex + interfaceHex;
 }
 
-TEST_F(RecordingWriterFiles, holdTheBytesOfTheFormat) {
+TEST_F(PcapngWriterFiles, holdTheBytesOfTheFormat) {
     const auto writer = create();
     // 2026-11-16 05:00:00.000000001 is 1794805200000000001 ns, 0x18E86DD1F3062001.
     ASSERT_TRUE(
@@ -109,28 +109,28 @@ TEST_F(RecordingWriterFiles, holdTheBytesOfTheFormat) {
                                      .bytes()));
 }
 
-TEST_F(RecordingWriterFiles, haveTheirHeadAtOnce) {
+TEST_F(PcapngWriterFiles, haveTheirHeadAtOnce) {
     const auto writer = create();
     EXPECT_EQ(content(), hexText(hex(headHex()).bytes()));
 }
 
-TEST_F(RecordingWriterFiles, nameATechnologyByItsShortName) {
+TEST_F(PcapngWriterFiles, nameATechnologyByItsShortName) {
     ASSERT_TRUE(create("kVoxLogChannelTechnology_Ostrel_GSM")->close());
     EXPECT_EQ(content(), hexText(hex(headHex()).bytes()));
 }
 
-TEST_F(RecordingWriterFiles, areEmptiedFirst) {
+TEST_F(PcapngWriterFiles, areEmptiedFirst) {
     std::ofstream(_path) << std::string(1000, 'x');
     ASSERT_TRUE(create()->close());
     EXPECT_EQ(content(), hexText(hex(headHex()).bytes()));
 }
 
-TEST_F(RecordingWriterFiles, getEveryMessageByTheEndOfTheWriter) {
+TEST_F(PcapngWriterFiles, getEveryMessageByTheEndOfTheWriter) {
     ASSERT_TRUE(create()->append(at(1), hex("AA").bytes()));
     EXPECT_EQ(content().size(), 2 * (100U + 36U));
 }
 
-TEST_F(RecordingWriterFiles, growByWholeBlocks) {
+TEST_F(PcapngWriterFiles, growByWholeBlocks) {
     const auto writer = create();
     const std::vector<std::uint8_t> message(1000, 0x11);
     std::uintmax_t sizes = 0;
@@ -145,16 +145,16 @@ TEST_F(RecordingWriterFiles, growByWholeBlocks) {
     EXPECT_GT(sizes, 900'000U);
 }
 
-TEST_F(RecordingWriterFiles, takeAMomentBefore1970ForItsBegin) {
+TEST_F(PcapngWriterFiles, takeAMomentBefore1970ForItsBegin) {
     const auto writer = create();
     ASSERT_TRUE(writer->append(at(-1), hex("AA").bytes()));
     ASSERT_TRUE(writer->close());
-    const auto reader = RecordingReader::open(_path);
+    const auto reader = PcapngReader::open(_path);
     ASSERT_TRUE(reader);
     EXPECT_EQ((*reader)->next()->time, at(0));
 }
 
-TEST_F(RecordingWriterFiles, takeMessagesUpTo16MiB) {
+TEST_F(PcapngWriterFiles, takeMessagesUpTo16MiB) {
     const auto writer = create();
     std::vector<std::uint8_t> longest(16'777'216);
     for (std::size_t i = 0; i < longest.size(); ++i)
@@ -169,7 +169,7 @@ TEST_F(RecordingWriterFiles, takeMessagesUpTo16MiB) {
     EXPECT_EQ(writer->messages(), 3U);
     ASSERT_TRUE(writer->close());
 
-    const auto reader = RecordingReader::open(_path);
+    const auto reader = PcapngReader::open(_path);
     ASSERT_TRUE(reader);
     EXPECT_EQ(hexText((*reader)->next()->message.bytes()), "AA");
     EXPECT_TRUE((*reader)->next()->message == Data::copyOf(longest));
@@ -178,7 +178,7 @@ TEST_F(RecordingWriterFiles, takeMessagesUpTo16MiB) {
     EXPECT_EQ((*reader)->lossTotals().losses, 0U);
 }
 
-TEST_F(RecordingWriterFiles, giveRandomMessagesBack) {
+TEST_F(PcapngWriterFiles, giveRandomMessagesBack) {
     std::mt19937 random(20'261'116);
     std::vector<LoggedMessage> written;
     const auto writer = create("Ostrel_UTRAN2");
@@ -191,7 +191,7 @@ TEST_F(RecordingWriterFiles, giveRandomMessagesBack) {
         written.push_back({time, Data(std::move(message)), 0, 0});
     }
     ASSERT_TRUE(writer->close());
-    const auto reader = RecordingReader::open(_path);
+    const auto reader = PcapngReader::open(_path);
     ASSERT_TRUE(reader);
     EXPECT_EQ((*reader)->technology(), "Ostrel_UTRAN2");
     std::uint64_t number = 0;
@@ -206,24 +206,24 @@ TEST_F(RecordingWriterFiles, giveRandomMessagesBack) {
     EXPECT_EQ((*reader)->lossTotals().losses, 0U);
 }
 
-TEST(RecordingWriter, tellsThatTheFileCannotBeCreated) {
-    const auto writer = RecordingWriter::create("/nonexistent/recording.pcapng", "Ostrel_GSM");
+TEST(PcapngWriter, tellsThatTheFileCannotBeCreated) {
+    const auto writer = PcapngWriter::create("/nonexistent/recording.pcapng", "Ostrel_GSM");
     ASSERT_FALSE(writer);
     EXPECT_EQ(writer.reason(), "cannot create /nonexistent/recording.pcapng: No such file or directory");
 }
 
-TEST(RecordingWriter, tellsThatTheMediumIsFull) {
-    const auto writer = RecordingWriter::create("/dev/full", "Ostrel_GSM");
+TEST(PcapngWriter, tellsThatTheMediumIsFull) {
+    const auto writer = PcapngWriter::create("/dev/full", "Ostrel_GSM");
     ASSERT_FALSE(writer);
     EXPECT_EQ(writer.reason(), "cannot write /dev/full: No space left on device");
 }
 
-TEST(RecordingWriter, tellsAWriteErrorEverAfter) {
+TEST(PcapngWriter, tellsAWriteErrorEverAfter) {
     // The disk becomes full once the header is written.
     TemporaryDirectory directory;
     const std::string path = directory / "recording";
     const int descriptor = ::open(path.c_str(), O_WRONLY | O_CREAT, 0600);
-    auto writer = RecordingWriter::adopt(descriptor, "the recording", "Ostrel_GSM");
+    auto writer = PcapngWriter::adopt(descriptor, "the recording", "Ostrel_GSM");
     ASSERT_TRUE(writer);
     const int full = ::open("/dev/full", O_WRONLY);
     ASSERT_EQ(::dup2(full, descriptor), descriptor);
@@ -250,11 +250,11 @@ TEST(RecordingWriter, tellsAWriteErrorEverAfter) {
     EXPECT_EQ(status.st_size, 100);
 }
 
-TEST(RecordingWriter, tellsAWriteErrorOfALongMessage) {
+TEST(PcapngWriter, tellsAWriteErrorOfALongMessage) {
     int ends[2];
     ASSERT_EQ(::pipe(ends), 0);
     auto* const earlier = std::signal(SIGPIPE, SIG_IGN);
-    auto writer = RecordingWriter::adopt(ends[1], "pipe", "Ostrel_GSM");
+    auto writer = PcapngWriter::adopt(ends[1], "pipe", "Ostrel_GSM");
     ASSERT_TRUE(writer);
     ::close(ends[0]);
     const std::vector<std::uint8_t> message(100'000);
@@ -265,8 +265,8 @@ TEST(RecordingWriter, tellsAWriteErrorOfALongMessage) {
     std::signal(SIGPIPE, earlier);
 }
 
-TEST(RecordingWriter, refusesATechnologyNameThatIsTooLong) {
-    const auto writer = RecordingWriter::create("/dev/null", std::string(256, 'x'));
+TEST(PcapngWriter, refusesATechnologyNameThatIsTooLong) {
+    const auto writer = PcapngWriter::create("/dev/null", std::string(256, 'x'));
     ASSERT_FALSE(writer);
     EXPECT_EQ(writer.reason(), "technology name of 256 bytes, wanted at most 255");
 }

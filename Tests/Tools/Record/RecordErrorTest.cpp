@@ -18,7 +18,7 @@ using namespace std::chrono_literals;
 using testing::ElementsAre;
 
 /// What a recorder does when not all goes well: disk, service, or itself.
-class RecordTroubleTest : public RecordTest {
+class RecordErrorTest : public RecordTest {
 protected:
     [[nodiscard]] std::uintmax_t size() const { return std::filesystem::file_size(path("drive.pcapng")); }
     [[nodiscard]] std::string words(const std::vector<std::string>& lines) const {
@@ -34,7 +34,7 @@ protected:
     const std::string _gone = "the telephony service is gone; waiting for it";
 };
 
-TEST_F(RecordTroubleTest, FileThatMayNotGrowIsWrittenWhenItMay) {
+TEST_F(RecordErrorTest, FileThatMayNotGrowIsWrittenWhenItMay) {
     startService();
     ToolProcess process(tool({"record", _file}));
     ASSERT_TRUE(isStreaming());
@@ -63,7 +63,7 @@ TEST_F(RecordTroubleTest, FileThatMayNotGrowIsWrittenWhenItMay) {
                 ElementsAre(rrState(1), rrState(2), rrState(3), rrState(4), rrState(5), rrState(6)));
 }
 
-TEST_F(RecordTroubleTest, MessagesThatFindNoRoomAreCounted) {
+TEST_F(RecordErrorTest, MessagesThatFindNoRoomAreCounted) {
     startService();
     ToolProcess process(tool({"record", _file}));
     ASSERT_TRUE(isStreaming());
@@ -89,7 +89,7 @@ TEST_F(RecordTroubleTest, MessagesThatFindNoRoomAreCounted) {
     EXPECT_THAT(messagesOf("drive.pcapng", "Ostrel_GSM"), ElementsAre(rrState(1), large, large));
 }
 
-TEST_F(RecordTroubleTest, MessagesThatAreNotSavedInTheEndAreTold) {
+TEST_F(RecordErrorTest, MessagesThatAreNotSavedInTheEndAreTold) {
     startService();
     ToolProcess::Setup setup = tool({"record", _file});
     setup.environment["GCOV_PREFIX"] = path("counts"); // a program that counts its coverage spoils its files
@@ -109,7 +109,7 @@ TEST_F(RecordTroubleTest, MessagesThatAreNotSavedInTheEndAreTold) {
     EXPECT_THAT(messagesOf("drive.pcapng", "Ostrel_GSM"), ElementsAre(rrState(1)));
 }
 
-TEST_F(RecordTroubleTest, ServiceThatGoesAndComesBackIsTold) {
+TEST_F(RecordErrorTest, ServiceThatGoesAndComesBackIsTold) {
     startService();
     ToolProcess process(tool({"record", _file}));
     ASSERT_TRUE(isStreaming());
@@ -129,7 +129,7 @@ TEST_F(RecordTroubleTest, ServiceThatGoesAndComesBackIsTold) {
               words({_gone, "the telephony service is back", "recorded 2 messages of Ostrel_GSM, 34 bytes"}));
 }
 
-TEST_F(RecordTroubleTest, TerminalShowsProgress) {
+TEST_F(RecordErrorTest, TerminalShowsProgress) {
     ToolProcess::Setup setup = tool({"record", "--log-level", "0", _file});
     setup.onTerminal = true;
     setup.errorsOnTerminal = true;
@@ -161,7 +161,7 @@ TEST_F(RecordTroubleTest, TerminalShowsProgress) {
     EXPECT_THAT(rest, testing::Not(testing::HasSubstr("bytes, "))) << "the progress is gone";
 }
 
-TEST_F(RecordTroubleTest, KilledRecorderLacksTheLastSecondAtMost) {
+TEST_F(RecordErrorTest, KilledRecorderLacksTheLastSecondAtMost) {
     using Instant = std::chrono::steady_clock::time_point;
     struct Victim {
         std::string name;

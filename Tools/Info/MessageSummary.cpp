@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Tools/Info/RecordingSummary.h"
+#include "Tools/Info/MessageSummary.h"
 
 #include "LogMessages/LogMessage.h"
 #include "Platform/DateText.h"
@@ -15,7 +15,7 @@ namespace velmora {
 
 namespace {
 
-void count(RecordingSummary::Count& counted, const LoggedMessage& message) {
+void count(MessageSummary::Count& counted, const LoggedMessage& message) {
     if (counted.messages++ == 0) {
         counted.firstNumber = message.number;
         counted.firstOffset = message.offset;
@@ -41,7 +41,7 @@ std::string durationText(Time first, Time last) {
     return text;
 }
 
-std::string codeTable(const RecordingSummary& summary, const CodeNames& names) {
+std::string codeTable(const MessageSummary& summary, const CodeNames& names) {
     std::string text = std::string("\n    code     messages  ") + names.heading + "\n";
     for (const auto& [code, counted] : summary.codes()) {
         char line[64];
@@ -54,7 +54,7 @@ std::string codeTable(const RecordingSummary& summary, const CodeNames& names) {
     return text;
 }
 
-std::string countLine(const char* label, const RecordingSummary::Count& counted) {
+std::string countLine(const char* label, const MessageSummary::Count& counted) {
     std::string text = label + std::to_string(counted.messages);
     if (counted.messages != 0)
         text += " (first: record " + std::to_string(counted.firstNumber) + " at offset " +
@@ -78,7 +78,7 @@ std::string lossLines(const MessageReader& reader) {
 
 } // namespace
 
-void RecordingSummary::add(const LoggedMessage& message) {
+void MessageSummary::add(const LoggedMessage& message) {
     ++_messages;
     _bytes += message.message.size();
     _first = _first ? std::min(*_first, message.time) : message.time;
@@ -98,8 +98,8 @@ void RecordingSummary::add(const LoggedMessage& message) {
         count(_wrongType, message);
 }
 
-std::string summaryText(const RecordingSummary& summary, const std::string& technology,
-                        const CodeNames& names, const MessageReader& reader) {
+std::string summaryText(const MessageSummary& summary, const std::string& technology, const CodeNames& names,
+                        const MessageReader& reader) {
     std::string text = "form:       " + std::string(reader.form()) + "\n";
     text += "technology: " + (technology.empty() ? "not named" : printable(technology)) + "\n";
     if (summary.first()) {

@@ -15,7 +15,7 @@
 namespace velmora {
 
 /// Counts of a recording, made message by message.
-class RecordingSummary {
+class MessageSummary {
 public:
     /// Messages of one kind, and the position of the first.
     struct Count {
@@ -26,7 +26,7 @@ public:
 
     /// `binary`: whether the messages are records with a header, which those of the serialized-object stream
     /// are not.
-    explicit RecordingSummary(bool binary) : _binary(binary) {}
+    explicit MessageSummary(bool binary) : _binary(binary) {}
 
     void add(const LoggedMessage& message);
 
@@ -65,7 +65,7 @@ struct CodeNames {
 };
 
 /// The summary as `info` prints it.
-[[nodiscard]] std::string summaryText(const RecordingSummary& summary, const std::string& technology,
+[[nodiscard]] std::string summaryText(const MessageSummary& summary, const std::string& technology,
                                       const CodeNames& names, const MessageReader& reader);
 
 } // namespace velmora

@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Recording/Pcapng/RecordingWriter.h"
+#include "Recording/Pcapng/PcapngWriter.h"
 
 #include "Platform/TelephonyService.h"
 #include "Recording/Files/DescriptorFile.h"
@@ -29,8 +29,8 @@ bool mayPass(int error) {
 
 } // namespace
 
-Result<std::unique_ptr<RecordingWriter>> RecordingWriter::create(const std::string& path,
-                                                                 std::string_view technology) {
+Result<std::unique_ptr<PcapngWriter>> PcapngWriter::create(const std::string& path,
+                                                           std::string_view technology) {
     if (path == "-")
         return start(std::make_unique<DescriptorFile>(STDOUT_FILENO, false), "standard output", technology);
     const int descriptor = ::open(path.c_str(), O_WRONLY | O_CREAT | O_TRUNC | O_CLOEXEC, 0666);
@@ -39,41 +39,41 @@ Result<std::unique_ptr<RecordingWriter>> RecordingWriter::create(const std::stri
     return adopt(descriptor, path, technology);
 }
 
-Result<std::unique_ptr<RecordingWriter>> RecordingWriter::adopt(int descriptor, std::string name,
-                                                                std::string_view technology) {
+Result<std::unique_ptr<PcapngWriter>> PcapngWriter::adopt(int descriptor, std::string name,
+                                                          std::string_view technology) {
     return start(std::make_unique<DescriptorFile>(descriptor, true), std::move(name), technology);
 }
 
-Result<std::unique_ptr<RecordingWriter>>
-RecordingWriter::start(std::unique_ptr<RecordingFile> file, std::string name, std::string_view technology) {
-    std::unique_ptr<RecordingWriter> writer(new RecordingWriter(std::move(file), std::move(name)));
+Result<std::unique_ptr<PcapngWriter>> PcapngWriter::start(std::unique_ptr<OutputFile> file, std::string name,
+                                                          std::string_view technology) {
+    std::unique_ptr<PcapngWriter> writer(new PcapngWriter(std::move(file), std::move(name)));
     const std::string_view shortName = shortTechnologyName(technology);
     if (shortName.size() > maximumTechnology)
         return Failure{"technology name of " + std::to_string(shortName.size()) + " bytes, wanted at most " +
                        std::to_string(maximumTechnology)};
-    recordingBlocks::appendHead(writer->_buffer, shortName);
+    pcapngBlocks::appendHead(writer->_buffer, shortName);
     if (const Result<Done> written = writer->flush(); !written && !writer->isWaiting())
         return Failure{written.reason()};
     return writer;
 }
 
-RecordingWriter::RecordingWriter(std::unique_ptr<RecordingFile> file, std::string name)
+PcapngWriter::PcapngWriter(std::unique_ptr<OutputFile> file, std::string name)
     : _file(std::move(file)), _name(std::move(name)) {
     _buffer.reserve(2 * flushThreshold);
 }
 
-RecordingWriter::~RecordingWriter() {
+PcapngWriter::~PcapngWriter() {
     const Result<Done> closed = close();
     static_cast<void>(closed); // callers that need the result call close themselves
 }
 
-Result<Done> RecordingWriter::append(Time time, Bytes message) {
+Result<Done> PcapngWriter::append(Time time, Bytes message) {
     if (_failure)
         return *_failure;
     if (message.size() > maximumMessageSize)
         return Failure{"message of " + std::to_string(message.size()) + " bytes, wanted at most " +
                        std::to_string(maximumMessageSize)};
-    const std::size_t length = recordingBlocks::packetSize(message.size());
+    const std::size_t length = pcapngBlocks::packetSize(message.size());
     // What has been gathered goes out ahead of a long message, so that the buffer need not hold both.
     if (!_trouble && !waiting().empty() && waiting().size() + length > 2 * flushThreshold) {
         if (Result<Done> written = flush(); !written && !_trouble)
@@ -84,12 +84,12 @@ Result<Done> RecordingWriter::append(Time time, Bytes message) {
         ++_dropped;
         return *_trouble;
     }
-    recordingBlocks::appendPacket(_buffer, time, message);
+    pcapngBlocks::appendPacket(_buffer, time, message);
     ++_messages;
     return _trouble || waiting().size() < flushThreshold ? outcome() : flush();
 }
 
-Result<Done> RecordingWriter::flush() {
+Result<Done> PcapngWriter::flush() {
     if (_failure)
         return *_failure;
     // What a temporary failure has left after the last whole block is cut off first.
@@ -98,7 +98,7 @@ Result<Done> RecordingWriter::flush() {
         return outcome();
     }
     for (Bytes rest = waiting(); !rest.empty();) {
-        const RecordingFile::Written written = _file->write(rest);
+        const OutputFile::Written written = _file->write(rest);
         if (written.error != 0) {
             noteFailure("write", written.error);
             return outcome();
@@ -113,7 +113,7 @@ Result<Done> RecordingWriter::flush() {
     return Done{};
 }
 
-Result<Done> RecordingWriter::sync() {
+Result<Done> PcapngWriter::sync() {
     _keeps = _file->isRegular();
     // A sync that failed is retried by the next call, so that this one returns the failure.
     if (!collectSync())
@@ -128,7 +128,7 @@ Result<Done> RecordingWriter::sync() {
     return Done{};
 }
 
-Result<Done> RecordingWriter::close() {
+Result<Done> PcapngWriter::close() {
     if (!_file)
         return outcome();
     Result<Done> flushed = flush();
@@ -141,11 +141,11 @@ Result<Done> RecordingWriter::close() {
     return outcome();
 }
 
-recordingBlocks::PacketCount RecordingWriter::unsaved() const {
-    return recordingBlocks::countPackets(waiting());
+pcapngBlocks::PacketCount PcapngWriter::unsaved() const {
+    return pcapngBlocks::countPackets(waiting());
 }
 
-Result<Done> RecordingWriter::outcome() const {
+Result<Done> PcapngWriter::outcome() const {
     if (_failure)
         return *_failure;
     if (_trouble)
@@ -153,7 +153,7 @@ Result<Done> RecordingWriter::outcome() const {
     return Done{};
 }
 
-bool RecordingWriter::collectSync() {
+bool PcapngWriter::collectSync() {
     const std::optional<int> error = _syncIsUnderWay ? _file->takeSyncOutcome() : std::nullopt;
     if (!error)
         return true;
@@ -161,12 +161,12 @@ bool RecordingWriter::collectSync() {
     return applySyncResult(*error, _syncing);
 }
 
-bool RecordingWriter::syncNow() {
+bool PcapngWriter::syncNow() {
     _syncIsUnderWay = false;
     return applySyncResult(_file->sync(), _end);
 }
 
-bool RecordingWriter::applySyncResult(int error, std::uint64_t end) {
+bool PcapngWriter::applySyncResult(int error, std::uint64_t end) {
     // Some file systems cannot sync, and say so with an error that does not count.
     if (mayPass(error)) {
         // What has not been synced is written again.
@@ -180,8 +180,8 @@ bool RecordingWriter::applySyncResult(int error, std::uint64_t end) {
     return true;
 }
 
-void RecordingWriter::noteFailure(const char* operation, int error) {
-    _end = _base + recordingBlocks::wholeBlocks(_buffer, written());
+void PcapngWriter::noteFailure(const char* operation, int error) {
+    _end = _base + pcapngBlocks::wholeBlocks(_buffer, written());
     const bool passing = mayPass(error) && _file->isRegular();
     const int cutError = passing ? _file->cutTo(_end) : 0;
     if (passing && (cutError == 0 || mayPass(cutError))) {
@@ -192,12 +192,12 @@ void RecordingWriter::noteFailure(const char* operation, int error) {
     _failure = failureOf(operation, error);
 }
 
-Failure RecordingWriter::failureOf(const char* operation, int error) const {
+Failure PcapngWriter::failureOf(const char* operation, int error) const {
     return Failure{std::string("cannot ") + operation + " " + _name + ": " +
                    std::generic_category().message(error)};
 }
 
-void RecordingWriter::forget(std::size_t length) {
+void PcapngWriter::forget(std::size_t length) {
     _buffer.erase(_buffer.begin(), _buffer.begin() + static_cast<std::ptrdiff_t>(length));
     _base += length;
     if (_buffer.empty() && _buffer.capacity() > maximumKept) { // a long queue's room

@@ -11,7 +11,7 @@
 namespace velmora {
 
 /// The clock of a recording that is being decoded: the time of the current message or tick, in UTC.
-class RecordedClock final : public Clock {
+class MessageClock final : public Clock {
 public:
     [[nodiscard]] Time now() const override { return _now; }
     [[nodiscard]] ZoneState zoneAt(Time) const override { return {}; }
@@ -24,7 +24,7 @@ private:
 /// The refreshes of a recording, at the application's interval: ticks lie every 2 s of recorded time from the
 /// first message on, and a tick with messages since the last one refreshes. Time stamps that go back make no
 /// tick due; a jump ahead costs the same whatever its length.
-class RecordedTicks {
+class RefreshTicks {
 public:
     static constexpr std::chrono::nanoseconds interval = std::chrono::seconds(2);
 

@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Tools/Decode/RecordedTime.h"
+#include "Tools/Decode/RefreshTicks.h"
 
 #include <gtest/gtest.h>
 
@@ -12,12 +12,12 @@ using namespace std::chrono_literals;
 
 constexpr Time start = Time(1'000s);
 
-TEST(RecordedTicksTest, WithoutMessagesThereIsNoTick) {
-    EXPECT_EQ(RecordedTicks().last(), std::nullopt);
+TEST(RefreshTicksTest, WithoutMessagesThereIsNoTick) {
+    EXPECT_EQ(RefreshTicks().last(), std::nullopt);
 }
 
-TEST(RecordedTicksTest, TicksLieEveryTwoSecondsFromTheFirstMessageOn) {
-    RecordedTicks ticks;
+TEST(RefreshTicksTest, TicksLieEveryTwoSecondsFromTheFirstMessageOn) {
+    RefreshTicks ticks;
     EXPECT_EQ(ticks.before(start), std::nullopt);
     EXPECT_EQ(ticks.before(start + 500ms), std::nullopt);
     EXPECT_EQ(ticks.before(start + 2s - 1ns), std::nullopt);
@@ -27,8 +27,8 @@ TEST(RecordedTicksTest, TicksLieEveryTwoSecondsFromTheFirstMessageOn) {
     EXPECT_EQ(ticks.last(), start + 6s);
 }
 
-TEST(RecordedTicksTest, TickComesBeforeAMessageStampedAtIt) {
-    RecordedTicks ticks;
+TEST(RefreshTicksTest, TickComesBeforeAMessageStampedAtIt) {
+    RefreshTicks ticks;
     EXPECT_EQ(ticks.before(start), std::nullopt);
     EXPECT_EQ(ticks.before(start + 2s), start + 2s);
     EXPECT_EQ(ticks.before(start + 2s), std::nullopt);
@@ -36,8 +36,8 @@ TEST(RecordedTicksTest, TickComesBeforeAMessageStampedAtIt) {
     EXPECT_EQ(ticks.last(), start + 6s);
 }
 
-TEST(RecordedTicksTest, TicksWithoutMessagesDoNotRefresh) {
-    RecordedTicks ticks;
+TEST(RefreshTicksTest, TicksWithoutMessagesDoNotRefresh) {
+    RefreshTicks ticks;
     EXPECT_EQ(ticks.before(start), std::nullopt);
     // Those at 4 s to 100 s have had none.
     EXPECT_EQ(ticks.before(start + 101s), start + 2s);
@@ -45,8 +45,8 @@ TEST(RecordedTicksTest, TicksWithoutMessagesDoNotRefresh) {
     EXPECT_EQ(ticks.before(start + 102s), start + 102s);
 }
 
-TEST(RecordedTicksTest, TimeThatGoesBackMakesNoTickDue) {
-    RecordedTicks ticks;
+TEST(RefreshTicksTest, TimeThatGoesBackMakesNoTickDue) {
+    RefreshTicks ticks;
     EXPECT_EQ(ticks.before(start), std::nullopt);
     EXPECT_EQ(ticks.before(start - 3600s), std::nullopt);
     EXPECT_EQ(ticks.before(Time::min()), std::nullopt);
@@ -54,8 +54,8 @@ TEST(RecordedTicksTest, TimeThatGoesBackMakesNoTickDue) {
     EXPECT_EQ(ticks.before(start + 3s), start + 2s);
 }
 
-TEST(RecordedTicksTest, TimeThatJumpsFromTheBeginningToTheEndIsNoWork) {
-    RecordedTicks ticks;
+TEST(RefreshTicksTest, TimeThatJumpsFromTheBeginningToTheEndIsNoWork) {
+    RefreshTicks ticks;
     EXPECT_EQ(ticks.before(Time::min()), std::nullopt);
     EXPECT_EQ(ticks.before(Time::max()), Time::min() + 2s);
     // No later moment is left for a tick.
@@ -65,7 +65,7 @@ TEST(RecordedTicksTest, TimeThatJumpsFromTheBeginningToTheEndIsNoWork) {
 }
 
 TEST(RecordedClockTest, ShowsWhatItWasSetToInUTC) {
-    RecordedClock clock;
+    MessageClock clock;
     clock.setNow(start);
     EXPECT_EQ(clock.now(), start);
     EXPECT_EQ(clock.zoneAt(start).offset, 0s);

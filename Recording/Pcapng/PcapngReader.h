@@ -28,7 +28,7 @@ namespace velmora {
 /// Where a block is damaged, reading resumes at the next block that is not. Memory is bounded whatever the
 /// file holds; a message is a window on the reader's chunk and keeps that alive: copy messages that are kept
 /// for long. A message's number is the packet's place in the file, as capture tools count. Main thread only.
-class RecordingReader final : public MessageReader {
+class PcapngReader final : public MessageReader {
 public:
     /// What was skipped because it is not a log message.
     struct PassedOver {
@@ -38,9 +38,9 @@ public:
 
     /// Opens a file, "-" being standard input, and reads up to its first interface of log messages, or its
     /// first packet. Fails when it cannot be read or is no pcapng file; the reason does not repeat the path.
-    static Result<std::unique_ptr<RecordingReader>> open(const std::string& path);
+    static Result<std::unique_ptr<PcapngReader>> open(const std::string& path);
     /// As above, for an input of which nothing has been skipped.
-    static Result<std::unique_ptr<RecordingReader>> open(ChunkedInput input);
+    static Result<std::unique_ptr<PcapngReader>> open(ChunkedInput input);
 
     [[nodiscard]] std::optional<LoggedMessage> next() override;
     [[nodiscard]] const std::string& technology() const override { return _technology; }
@@ -66,7 +66,7 @@ private:
         std::uint32_t original = 0; ///< bytes of the message
     };
 
-    explicit RecordingReader(ChunkedInput input) : _blocks(std::move(input)) {}
+    explicit PcapngReader(ChunkedInput input) : _blocks(std::move(input)) {}
 
     [[nodiscard]] const Block* nextBlock();
     void takeIn(const Block& block);

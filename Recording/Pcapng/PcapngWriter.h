@@ -6,8 +6,8 @@
 #include "Platform/Bytes.h"
 #include "Platform/Clock.h"
 #include "Platform/Result.h"
-#include "Recording/Files/RecordingFile.h"
-#include "Recording/Pcapng/RecordingBlocks.h"
+#include "Recording/Files/OutputFile.h"
+#include "Recording/Pcapng/PcapngBlocks.h"
 
 #include <cstddef>
 #include <cstdint>
@@ -19,7 +19,7 @@
 
 namespace velmora {
 
-/// Writes a recording (see RecordingBlocks.h). Messages are buffered and written as whole blocks, so that a
+/// Writes a recording (see PcapngBlocks.h). Messages are buffered and written as whole blocks, so that a
 /// writer that is killed loses the last ones and cuts at most one. Call `flush` where a reader waits at the
 /// other end, `sync` at regular intervals where the recording must survive a power failure.
 ///
@@ -31,7 +31,7 @@ namespace velmora {
 /// returns it and nothing more is written. `isWaiting` says which of the two it is.
 ///
 /// Owns its file; destroying it closes it as `close` does, but reports no failure. Main thread only.
-class RecordingWriter {
+class PcapngWriter {
 public:
     /// How much is queued during a temporary failure, in bytes of blocks.
     static constexpr std::size_t maximumQueue = std::size_t{32} << 20;
@@ -41,18 +41,17 @@ public:
     /// Creates the file, or empties it; "-" is standard output, which stays open afterwards. The file's head
     /// is written at once. `technology` is a technology's constant or short name, of at most 255 bytes. If
     /// writing the head fails temporarily, a writer is returned that is waiting.
-    static Result<std::unique_ptr<RecordingWriter>> create(const std::string& path,
-                                                           std::string_view technology);
+    static Result<std::unique_ptr<PcapngWriter>> create(const std::string& path, std::string_view technology);
     /// Writes to an open descriptor, which it takes over; failures name it `name`.
-    static Result<std::unique_ptr<RecordingWriter>> adopt(int descriptor, std::string name,
-                                                          std::string_view technology);
+    static Result<std::unique_ptr<PcapngWriter>> adopt(int descriptor, std::string name,
+                                                       std::string_view technology);
     /// Writes to any file of which nothing has been written.
-    static Result<std::unique_ptr<RecordingWriter>> start(std::unique_ptr<RecordingFile> file,
-                                                          std::string name, std::string_view technology);
+    static Result<std::unique_ptr<PcapngWriter>> start(std::unique_ptr<OutputFile> file, std::string name,
+                                                       std::string_view technology);
 
-    ~RecordingWriter();
-    RecordingWriter(const RecordingWriter&) = delete;
-    RecordingWriter& operator=(const RecordingWriter&) = delete;
+    ~PcapngWriter();
+    PcapngWriter(const PcapngWriter&) = delete;
+    PcapngWriter& operator=(const PcapngWriter&) = delete;
 
     /// Adds a message as it arrived. A time before 1970 cannot be recorded and becomes 1970-01-01. A message
     /// above 16 MiB is refused, which does not end the recording. Precondition: it has not been closed.
@@ -69,14 +68,14 @@ public:
     /// Messages dropped during temporary failures so far.
     [[nodiscard]] std::uint64_t droppedMessages() const { return _dropped; }
     /// Messages added that are not in the file.
-    [[nodiscard]] recordingBlocks::PacketCount unsaved() const;
+    [[nodiscard]] pcapngBlocks::PacketCount unsaved() const;
     /// Whether there is a temporary failure.
     [[nodiscard]] bool isWaiting() const { return _trouble.has_value(); }
     /// Whether messages are being dropped.
     [[nodiscard]] bool isDropping() const { return _dropping; }
 
 private:
-    RecordingWriter(std::unique_ptr<RecordingFile> file, std::string name);
+    PcapngWriter(std::unique_ptr<OutputFile> file, std::string name);
 
     [[nodiscard]] std::size_t written() const { return static_cast<std::size_t>(_end - _base); }
     [[nodiscard]] Bytes waiting() const { return Bytes(_buffer).subspan(written()); }
@@ -94,7 +93,7 @@ private:
     /// Removes the first `length` bytes of the buffer.
     void forget(std::size_t length);
 
-    std::unique_ptr<RecordingFile> _file; ///< null when closed
+    std::unique_ptr<OutputFile> _file; ///< null when closed
     std::string _name;
     std::vector<std::uint8_t> _buffer; ///< complete blocks: unsynced ones, then those not yet in the file
     std::uint64_t _base = 0;           ///< where in the file the buffer begins

@@ -13,7 +13,7 @@
 
 /// The blocks of a recording as they are written: little-endian pcapng, one section with one interface (link
 /// type 147, nanoseconds, the technology as its name), then one Enhanced Packet Block a message.
-namespace velmora::recordingBlocks {
+namespace velmora::pcapngBlocks {
 
 /// Adds the section header and the interface description. Precondition: `technology` has at most 65535 bytes.
 void appendHead(std::vector<std::uint8_t>& buffer, std::string_view technology);
@@ -37,4 +37,4 @@ struct PacketCount {
 /// What such blocks hold.
 [[nodiscard]] PacketCount countPackets(Bytes blocks);
 
-} // namespace velmora::recordingBlocks
+} // namespace velmora::pcapngBlocks

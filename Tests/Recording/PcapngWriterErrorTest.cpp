@@ -14,9 +14,9 @@ namespace {
 
 using testing::ElementsAre;
 
-using RecordingTroubleTest = RecordingTroubleFixture;
+using PcapngWriterErrorTest = RecordingTroubleFixture;
 
-TEST_F(RecordingTroubleTest, FullDiskKeepsWholeBlocksAndGoesOnWithoutAGap) {
+TEST_F(PcapngWriterErrorTest, FullDiskKeepsWholeBlocksAndGoesOnWithoutAGap) {
     start();
     ASSERT_TRUE(append(1));
     ASSERT_TRUE(writer->flush());
@@ -51,9 +51,9 @@ TEST_F(RecordingTroubleTest, FullDiskKeepsWholeBlocksAndGoesOnWithoutAGap) {
     EXPECT_THAT(numbers(), ElementsAre(1, 2, 3, 4, 5, 6));
 }
 
-TEST_F(RecordingTroubleTest, EveryRoomLeavesWholeBlocks) {
+TEST_F(PcapngWriterErrorTest, EveryRoomLeavesWholeBlocks) {
     for (std::size_t room = 0; room <= headSize + 3 * blockSize; ++room) {
-        medium = FakeMedium();
+        medium = FakeOutputFile();
         medium.room = room;
         start();
         for (std::uint8_t number = 1; number <= 3; ++number)
@@ -72,9 +72,9 @@ TEST_F(RecordingTroubleTest, EveryRoomLeavesWholeBlocks) {
     }
 }
 
-TEST_F(RecordingTroubleTest, ErrorsThatMayPass) {
+TEST_F(PcapngWriterErrorTest, ErrorsThatMayPass) {
     for (const int error : {ENOSPC, EDQUOT, EFBIG, EIO, EROFS}) {
-        medium = FakeMedium();
+        medium = FakeOutputFile();
         start();
         medium.room = 0;
         medium.fullError = error;
@@ -84,7 +84,7 @@ TEST_F(RecordingTroubleTest, ErrorsThatMayPass) {
     }
 }
 
-TEST_F(RecordingTroubleTest, OtherErrorsAreForGood) {
+TEST_F(PcapngWriterErrorTest, OtherErrorsAreForGood) {
     start();
     ASSERT_TRUE(append(1));
     medium.room = 0;
@@ -101,7 +101,7 @@ TEST_F(RecordingTroubleTest, OtherErrorsAreForGood) {
     EXPECT_THAT(numbers(), ElementsAre());
 }
 
-TEST_F(RecordingTroubleTest, WhatCannotBeTakenBackIsForGood) {
+TEST_F(PcapngWriterErrorTest, WhatCannotBeTakenBackIsForGood) {
     medium.isRegular = false;
     start();
     ASSERT_TRUE(append(1));
@@ -114,7 +114,7 @@ TEST_F(RecordingTroubleTest, WhatCannotBeTakenBackIsForGood) {
     EXPECT_EQ(medium.content.size(), headSize + 5);
 }
 
-TEST_F(RecordingTroubleTest, NothingIsWrittenBehindAPartThatCannotBeTakenBackYet) {
+TEST_F(PcapngWriterErrorTest, NothingIsWrittenBehindAPartThatCannotBeTakenBackYet) {
     start();
     ASSERT_TRUE(append(1));
     medium.room = headSize + 5;
@@ -129,7 +129,7 @@ TEST_F(RecordingTroubleTest, NothingIsWrittenBehindAPartThatCannotBeTakenBackYet
     EXPECT_THAT(numbers(), ElementsAre(1));
 }
 
-TEST_F(RecordingTroubleTest, HeadMayWaitToo) {
+TEST_F(PcapngWriterErrorTest, HeadMayWaitToo) {
     medium.room = 60;
     start();
     EXPECT_TRUE(writer->isWaiting());
@@ -140,7 +140,7 @@ TEST_F(RecordingTroubleTest, HeadMayWaitToo) {
     EXPECT_THAT(numbers(), ElementsAre(1));
 }
 
-TEST_F(RecordingTroubleTest, UnsavedMessagesAreKnownInTheEnd) {
+TEST_F(PcapngWriterErrorTest, UnsavedMessagesAreKnownInTheEnd) {
     start();
     medium.room = headSize;
     ASSERT_TRUE(append(1));
@@ -151,7 +151,7 @@ TEST_F(RecordingTroubleTest, UnsavedMessagesAreKnownInTheEnd) {
     EXPECT_EQ(writer->unsaved().bytes, 2U);
 }
 
-TEST_F(RecordingTroubleTest, QueueIsBoundedAndItsGapIsOne) {
+TEST_F(PcapngWriterErrorTest, QueueIsBoundedAndItsGapIsOne) {
     start();
     medium.room = headSize;
     ASSERT_TRUE(append(1));
@@ -179,7 +179,7 @@ TEST_F(RecordingTroubleTest, QueueIsBoundedAndItsGapIsOne) {
     EXPECT_THAT(numbers(), ElementsAre(1, 2, 2, 2, 2, 2, 2, 2, 2, 2, 2, 2, 2, 2, 2, 2, 4));
 }
 
-TEST_F(RecordingTroubleTest, ShortWritesAreNoTrouble) {
+TEST_F(PcapngWriterErrorTest, ShortWritesAreNoTrouble) {
     medium.longestWrite = 7;
     start();
     ASSERT_TRUE(append(1));
@@ -188,7 +188,7 @@ TEST_F(RecordingTroubleTest, ShortWritesAreNoTrouble) {
     EXPECT_THAT(numbers(), ElementsAre(1, 2));
 }
 
-TEST_F(RecordingTroubleTest, LongMessageIsKeptBehindTroubleThatMayPassAndNotBehindOther) {
+TEST_F(PcapngWriterErrorTest, LongMessageIsKeptBehindTroubleThatMayPassAndNotBehindOther) {
     // Above 128 KiB what has been gathered goes out ahead of the message.
     const std::vector<std::uint8_t> large(150'000, 2);
     start();
@@ -200,7 +200,7 @@ TEST_F(RecordingTroubleTest, LongMessageIsKeptBehindTroubleThatMayPassAndNotBehi
     ASSERT_TRUE(writer->close());
     EXPECT_THAT(numbers(), ElementsAre(1, 2));
 
-    medium = FakeMedium();
+    medium = FakeOutputFile();
     start();
     medium.room = headSize;
     medium.fullError = EBADF;

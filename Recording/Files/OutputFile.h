@@ -13,14 +13,14 @@ namespace velmora {
 
 /// The destination of a recording: a file, a pipe, a test's memory. Errors are errno values, 0 being none.
 /// Main thread only.
-class RecordingFile {
+class OutputFile {
 public:
     struct Written {
         std::size_t bytes = 0;
         int error = 0;
     };
 
-    virtual ~RecordingFile() = default;
+    virtual ~OutputFile() = default;
 
     /// Appends bytes, at least one unless there is an error. Blocks while a pipe is full.
     virtual Written write(Bytes bytes) = 0;

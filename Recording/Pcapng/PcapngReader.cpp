@@ -1,11 +1,11 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Recording/Pcapng/RecordingReader.h"
+#include "Recording/Pcapng/PcapngReader.h"
 
 #include "Platform/TelephonyService.h"
 #include "Recording/Files/FileSource.h"
-#include "Recording/Pcapng/FieldReader.h"
+#include "Recording/Pcapng/ByteReader.h"
 #include "Recording/Pcapng/Pcapng.h"
 
 #include <algorithm>
@@ -27,15 +27,15 @@ bool holdsPacket(std::uint32_t type) {
 
 } // namespace
 
-Result<std::unique_ptr<RecordingReader>> RecordingReader::open(const std::string& path) {
+Result<std::unique_ptr<PcapngReader>> PcapngReader::open(const std::string& path) {
     Result<std::unique_ptr<ByteSource>> source = FileSource::open(path);
     if (!source)
         return Failure{source.reason()};
     return open(ChunkedInput(*std::move(source)));
 }
 
-Result<std::unique_ptr<RecordingReader>> RecordingReader::open(ChunkedInput input) {
-    std::unique_ptr<RecordingReader> reader(new RecordingReader(std::move(input)));
+Result<std::unique_ptr<PcapngReader>> PcapngReader::open(ChunkedInput input) {
+    std::unique_ptr<PcapngReader> reader(new PcapngReader(std::move(input)));
     if (const Result<Done> section = reader->_blocks.expectSection(); !section)
         return Failure{section.reason()};
     while (!reader->_foundInterface) {
@@ -51,7 +51,7 @@ Result<std::unique_ptr<RecordingReader>> RecordingReader::open(ChunkedInput inpu
     return reader;
 }
 
-std::optional<LoggedMessage> RecordingReader::next() {
+std::optional<LoggedMessage> PcapngReader::next() {
     std::optional<LoggedMessage> message; // made where it is returned: there are millions of them
     while (!message) {
         const Block* const block = _waiting ? std::exchange(_waiting, nullptr) : nextBlock();
@@ -65,7 +65,7 @@ std::optional<LoggedMessage> RecordingReader::next() {
     return message;
 }
 
-const RecordingReader::Block* RecordingReader::nextBlock() {
+const PcapngReader::Block* PcapngReader::nextBlock() {
     const Block* const block = _blocks.next();
     if (_blocks.hasLoss()) {
         Loss loss = *_blocks.takeLoss();
@@ -75,12 +75,12 @@ const RecordingReader::Block* RecordingReader::nextBlock() {
     return block;
 }
 
-void RecordingReader::takeIn(const Block& block) {
+void PcapngReader::takeIn(const Block& block) {
     if (block.type == BlockType::InterfaceDescription) {
         takeInInterface(block);
     } else if (block.type == BlockType::SectionHeader) {
         _interfaces.clear();
-        FieldReader fields(block.bytes, block.bigEndian);
+        ByteReader fields(block.bytes, block.bigEndian);
         // What follows is read as far as it can be understood all the same.
         if (const std::uint16_t major = fields.u16(versionOffset); major != supportedMajorVersion)
             lose(block, _packets + 1,
@@ -89,7 +89,7 @@ void RecordingReader::takeIn(const Block& block) {
     }
 }
 
-void RecordingReader::takeInInterface(const Block& block) {
+void PcapngReader::takeInInterface(const Block& block) {
     using Use = Interface::Use;
     if (_interfaces.size() == maximumInterfaces) {
         lose(block, _packets + 1,
@@ -120,7 +120,7 @@ void RecordingReader::takeInInterface(const Block& block) {
         interface.use = Use::OtherTechnology;
 }
 
-void RecordingReader::takeMessage(const Block& block, std::optional<LoggedMessage>& message) {
+void PcapngReader::takeMessage(const Block& block, std::optional<LoggedMessage>& message) {
     using Use = Interface::Use;
     const std::uint64_t number = ++_packets;
     const Packet packet = packetOf(block);
@@ -150,8 +150,8 @@ void RecordingReader::takeMessage(const Block& block, std::optional<LoggedMessag
 }
 
 /// Fields that the block is too short for read as 0, and its bytes then begin past its end.
-RecordingReader::Packet RecordingReader::packetOf(const Block& block) const {
-    FieldReader fields(block.bytes.first(block.length - 4), block.bigEndian);
+PcapngReader::Packet PcapngReader::packetOf(const Block& block) const {
+    ByteReader fields(block.bytes.first(block.length - 4), block.bigEndian);
     Packet packet;
     if (block.type == BlockType::SimplePacket) {
         // Interface 0, no time stamp, no captured length: what is missing follows from the interface's limit.
@@ -173,7 +173,7 @@ RecordingReader::Packet RecordingReader::packetOf(const Block& block) const {
     return packet;
 }
 
-std::string RecordingReader::whyUnusable(const Packet& packet, const Block& block) const {
+std::string PcapngReader::whyUnusable(const Packet& packet, const Block& block) const {
     using Use = Interface::Use;
     const std::size_t room = block.length - 4;
     if (packet.offset > room)
@@ -201,7 +201,7 @@ std::string RecordingReader::whyUnusable(const Packet& packet, const Block& bloc
     return "time stamp " + std::to_string(packet.stamp) + " lies outside of the years 1678 to 2262";
 }
 
-void RecordingReader::lose(const Block& block, std::uint64_t number, std::string reason) {
+void PcapngReader::lose(const Block& block, std::uint64_t number, std::string reason) {
     addLoss({block.offset, block.length, number, std::move(reason), false});
 }
 

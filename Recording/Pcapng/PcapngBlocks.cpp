@@ -1,14 +1,14 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Recording/Pcapng/RecordingBlocks.h"
+#include "Recording/Pcapng/PcapngBlocks.h"
 
-#include "Recording/Pcapng/FieldReader.h"
+#include "Recording/Pcapng/ByteReader.h"
 #include "Recording/Pcapng/Pcapng.h"
 
 #include <algorithm>
 
-namespace velmora::recordingBlocks {
+namespace velmora::pcapngBlocks {
 
 namespace {
 
@@ -52,7 +52,7 @@ void putOption(Buffer& buffer, std::uint16_t code, std::string_view text) {
 
 /// The 32-bit field at that offset of the first block. Precondition: it lies within the block.
 std::uint32_t wordOf(Bytes blocks, std::size_t offset) {
-    return FieldReader(blocks, false).u32(offset);
+    return ByteReader(blocks, false).u32(offset);
 }
 
 constexpr std::size_t lengthOffset = 4;
@@ -128,4 +128,4 @@ PacketCount countPackets(Bytes blocks) {
     return count;
 }
 
-} // namespace velmora::recordingBlocks
+} // namespace velmora::pcapngBlocks

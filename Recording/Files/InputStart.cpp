@@ -1,14 +1,14 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Recording/Files/InputBegin.h"
+#include "Recording/Files/InputStart.h"
 
 #include <algorithm>
 #include <cstddef>
 
 namespace velmora {
 
-std::string unexpectedBegin(Bytes begin, std::string_view wanted) {
+std::string unexpectedStart(Bytes begin, std::string_view wanted) {
     constexpr std::size_t shown = 12;
     std::string text = begin.empty() ? "empty" : "begins ";
     constexpr char digits[] = "0123456789ABCDEF";
