@@ -29,8 +29,9 @@ bool same(const Contents& a, const Contents& b) {
                one.refresh == other.refresh && one.message == other.message;
     };
     const auto sameLoss = [](const Loss& one, const Loss& other) {
-        return one.offset == other.offset && one.bytes == other.bytes && one.isTail == other.isTail &&
-               one.recordNumber == other.recordNumber && one.reason == other.reason;
+        return one.offset == other.offset && one.bytes == other.bytes &&
+               one.isTruncation == other.isTruncation && one.recordNumber == other.recordNumber &&
+               one.reason == other.reason;
     };
     return a.failure == b.failure && a.technology == b.technology && a.totals.losses == b.totals.losses &&
            a.totals.bytes == b.totals.bytes &&

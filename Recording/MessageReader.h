@@ -36,9 +36,9 @@ struct Loss {
     std::uint64_t offset = 0; ///< its offset in the file, in bytes
     std::uint64_t bytes = 0;  ///< how many bytes of the file were skipped
     std::uint64_t recordNumber =
-        0;               ///< the lost record's number, or that of the next record where none is known
-    std::string reason;  ///< lower-case prose
-    bool isTail = false; ///< the file is truncated inside a record, as when its writer was killed
+        0;                     ///< the lost record's number, or that of the next record where none is known
+    std::string reason;        ///< lower-case prose
+    bool isTruncation = false; ///< the file is truncated inside a record, as when its writer was killed
 };
 
 /// A file read as a stream of log messages, front to back, whatever its form. What cannot be read is skipped

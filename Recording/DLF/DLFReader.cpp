@@ -9,7 +9,7 @@ namespace velmora {
 
 Result<std::unique_ptr<DLFReader>> DLFReader::open(ChunkedInput input, std::string_view wanted) {
     std::unique_ptr<DLFReader> reader(new DLFReader(std::move(input)));
-    const bool isLog = reader->_records.beginsSurely();
+    const bool isLog = reader->_records.looksLikeRecords();
     if (reader->failure() && !isLog)
         return *reader->failure();
     if (!isLog)

@@ -41,7 +41,7 @@ protected:
     /// The number of the record that was returned last.
     [[nodiscard]] std::uint64_t number() const { return _number; }
     /// Reports that the next record gives no message.
-    void loseRecord(std::uint64_t bytes, std::string reason);
+    void addRecordLoss(std::uint64_t bytes, std::string reason);
     /// Counts a record that is not part of a chain.
     void countRecord() { ++_number; }
     /// The time of the record's stamp; for a stamp of 0 or an invalid one, that of the last record with a

@@ -52,7 +52,7 @@ private:
     using Chunk = std::shared_ptr<std::vector<std::uint8_t>>;
 
     bool fill(std::size_t count);
-    void turnOver(std::size_t count);
+    void nextChunk(std::size_t count);
 
     std::unique_ptr<ByteSource> _source;
     std::size_t _chunkSize;

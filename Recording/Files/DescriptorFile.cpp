@@ -55,7 +55,7 @@ OutputFile::Written DescriptorFile::write(Bytes bytes) {
     }
 }
 
-int DescriptorFile::cutTo(std::uint64_t size) {
+int DescriptorFile::truncateTo(std::uint64_t size) {
     const auto end = static_cast<off_t>(_start + size);
     return ::ftruncate(_descriptor, end) == 0 && ::lseek(_descriptor, end, SEEK_SET) == end ? 0 : errno;
 }
@@ -71,7 +71,7 @@ void DescriptorFile::startSync() {
     }
 }
 
-std::optional<int> DescriptorFile::takeSyncOutcome() {
+std::optional<int> DescriptorFile::takeSyncResult() {
     if (!_syncing.valid() || _syncing.wait_for(std::chrono::seconds(0)) != std::future_status::ready)
         return std::nullopt;
     return _syncing.get();

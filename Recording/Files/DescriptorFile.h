@@ -21,9 +21,9 @@ public:
 
     Written write(Bytes bytes) override;
     [[nodiscard]] bool isRegular() const override { return _regular; }
-    int cutTo(std::uint64_t size) override;
+    int truncateTo(std::uint64_t size) override;
     void startSync() override;
-    std::optional<int> takeSyncOutcome() override;
+    std::optional<int> takeSyncResult() override;
     int sync() override;
     int close() override;
 

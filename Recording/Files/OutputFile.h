@@ -28,12 +28,12 @@ public:
     /// files only.
     [[nodiscard]] virtual bool isRegular() const = 0;
     /// Truncates the file to the first `size` bytes that were written; writing goes on after these.
-    virtual int cutTo(std::uint64_t size) = 0;
+    virtual int truncateTo(std::uint64_t size) = 0;
     /// Starts to sync all that was written, in the background. Does nothing while an earlier call's outcome
     /// has not been taken.
     virtual void startSync() = 0;
     /// How `startSync` ended; none while it is running, and once the outcome has been taken.
-    virtual std::optional<int> takeSyncOutcome() = 0;
+    virtual std::optional<int> takeSyncResult() = 0;
     /// Syncs all that was written and waits for it. Discards the outcome of `startSync`.
     virtual int sync() = 0;
     /// The last call.

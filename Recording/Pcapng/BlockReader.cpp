@@ -56,7 +56,7 @@ Result<Done> BlockReader::expectSection() {
     if (_input.failure())
         return *_input.failure();
     Block block;
-    if (!whole || ByteReader(begin, false).u32(0) != SectionHeader || examine(block) == Fault::NoByteOrder)
+    if (!whole || ByteReader(begin, false).u32(0) != SectionHeader || checkBlock(block) == Fault::NoByteOrder)
         return Failure{unexpectedStart(begin, "a pcapng section header")};
     return Done{};
 }
@@ -66,21 +66,21 @@ const BlockReader::Block* BlockReader::next() {
     for (;;) {
         if (!_input.ensure(1))
             return nullptr;
-        const Fault fault = examine(_present);
+        const Fault fault = checkBlock(_present);
         if (fault == Fault::None) {
             _bigEndian = _present.bigEndian;
             return &_present;
         }
-        passDamage(fault, std::exchange(_present, Block()));
+        skipDamage(fault, std::exchange(_present, Block()));
     }
 }
 
 /// Looks at the block that the input stands at, reading as much of it as its length says.
-BlockReader::Fault BlockReader::examine(Block& block) {
+BlockReader::Fault BlockReader::checkBlock(Block& block) {
     block.offset = _input.offset();
     block.length = 0;
     if (!_input.ensure(pcapng::blockOverhead))
-        return Fault::CutOff;
+        return Fault::Truncated;
     const Bytes header = _input.available();
     block.bigEndian = _bigEndian;
     block.type = ByteReader(header, _bigEndian).u32(0);
@@ -94,7 +94,7 @@ BlockReader::Fault BlockReader::examine(Block& block) {
     if (block.length < pcapng::blockOverhead || block.length % 4 != 0 || block.length > maximumBlockSize)
         return Fault::Length;
     if (!_input.ensure(block.length))
-        return Fault::CutOff;
+        return Fault::Truncated;
     block.bytes = _input.available().first(block.length);
     if (ByteReader(block.bytes, block.bigEndian).u32(block.length - 4) != block.length)
         return Fault::TrailingLength;
@@ -104,7 +104,7 @@ BlockReader::Fault BlockReader::examine(Block& block) {
 std::string BlockReader::describe(Fault fault, const Block& block) const {
     switch (fault) {
     case Fault::None: break;
-    case Fault::CutOff:
+    case Fault::Truncated:
         return std::string(block.length == 0 ? "block header" : "block") + " cut off after " +
                std::to_string(_input.available().size()) + " of " +
                std::to_string(block.length == 0 ? pcapng::blockOverhead : block.length) + " bytes";
@@ -121,7 +121,7 @@ std::string BlockReader::describe(Fault fault, const Block& block) const {
 }
 
 /// Passes over a block that does not hold together, and all up to the next that does.
-void BlockReader::passDamage(Fault fault, const Block& block) {
+void BlockReader::skipDamage(Fault fault, const Block& block) {
     Loss loss;
     loss.offset = block.offset;
     loss.reason = describe(fault, block);
@@ -129,17 +129,17 @@ void BlockReader::passDamage(Fault fault, const Block& block) {
     for (unsigned phase = 1; !found && _input.ensure(1); phase = (phase + 1) % 4) {
         _input.skip(1);
         if (phase == 0 || startsWith(_input.available(), sectionHeaderWord))
-            found = standsAtBlock();
+            found = isAtBlock();
     }
     if (!found)
         _input.skip(_input.available().size());
     loss.bytes = _input.offset() - block.offset;
     // Where a whole block follows, it was the length that was damaged.
-    loss.isTail = !found && fault == Fault::CutOff && !_input.failure();
+    loss.isTruncation = !found && fault == Fault::Truncated && !_input.failure();
     _loss = std::move(loss);
 }
 
-bool BlockReader::standsAtBlock() {
+bool BlockReader::isAtBlock() {
     if (!_input.ensure(pcapng::blockOverhead))
         return false;
     const Bytes header = _input.available();
@@ -150,7 +150,7 @@ bool BlockReader::standsAtBlock() {
         return false;
     if (type != SectionHeader && ByteReader(header, _bigEndian).u32(4) < leastLength(type))
         return false;
-    return examine(block) == Fault::None && block.length >= leastLength(type);
+    return checkBlock(block) == Fault::None && block.length >= leastLength(type);
 }
 
 } // namespace velmora

@@ -51,12 +51,12 @@ public:
     [[nodiscard]] const std::optional<Failure>& failure() const { return _input.failure(); }
 
 private:
-    enum class Fault : std::uint8_t { None, CutOff, NoByteOrder, Length, TrailingLength };
+    enum class Fault : std::uint8_t { None, Truncated, NoByteOrder, Length, TrailingLength };
 
-    [[nodiscard]] Fault examine(Block& block);
+    [[nodiscard]] Fault checkBlock(Block& block);
     [[nodiscard]] std::string describe(Fault fault, const Block& block) const;
-    void passDamage(Fault fault, const Block& block);
-    [[nodiscard]] bool standsAtBlock();
+    void skipDamage(Fault fault, const Block& block);
+    [[nodiscard]] bool isAtBlock();
 
     ChunkedInput _input;
     Block _present; ///< what `next` last gave

@@ -51,7 +51,7 @@ void putOption(Buffer& buffer, std::uint16_t code, std::string_view text) {
 }
 
 /// The 32-bit field at that offset of the first block. Precondition: it lies within the block.
-std::uint32_t wordOf(Bytes blocks, std::size_t offset) {
+std::uint32_t u32At(Bytes blocks, std::size_t offset) {
     return ByteReader(blocks, false).u32(offset);
 }
 
@@ -106,10 +106,10 @@ std::size_t packetSize(std::size_t messageSize) {
     return packetOverhead + pcapng::padded(messageSize);
 }
 
-std::size_t wholeBlocks(Bytes blocks, std::size_t length) {
+std::size_t completeBlocks(Bytes blocks, std::size_t length) {
     std::size_t whole = 0;
     while (whole < blocks.size()) {
-        const std::size_t next = whole + wordOf(blocks.subspan(whole), lengthOffset);
+        const std::size_t next = whole + u32At(blocks.subspan(whole), lengthOffset);
         if (next > length)
             break;
         whole = next;
@@ -119,11 +119,11 @@ std::size_t wholeBlocks(Bytes blocks, std::size_t length) {
 
 PacketCount countPackets(Bytes blocks) {
     PacketCount count;
-    for (; !blocks.empty(); blocks = blocks.subspan(wordOf(blocks, lengthOffset))) {
-        if (wordOf(blocks, 0) != BlockType::EnhancedPacket)
+    for (; !blocks.empty(); blocks = blocks.subspan(u32At(blocks, lengthOffset))) {
+        if (u32At(blocks, 0) != BlockType::EnhancedPacket)
             continue;
         ++count.messages;
-        count.bytes += wordOf(blocks, capturedOffset);
+        count.bytes += u32At(blocks, capturedOffset);
     }
     return count;
 }

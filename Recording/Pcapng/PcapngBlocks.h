@@ -27,7 +27,7 @@ void appendPacket(std::vector<std::uint8_t>& buffer, Time time, Bytes message);
 
 /// Of blocks as the functions above make them: the length of those that lie wholly within the first `length`
 /// bytes.
-[[nodiscard]] std::size_t wholeBlocks(Bytes blocks, std::size_t length);
+[[nodiscard]] std::size_t completeBlocks(Bytes blocks, std::size_t length);
 
 struct PacketCount {
     std::uint64_t messages = 0;

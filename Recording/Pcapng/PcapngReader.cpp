@@ -46,7 +46,7 @@ Result<std::unique_ptr<PcapngReader>> PcapngReader::open(ChunkedInput input) {
             reader->_waiting = block;
             break;
         }
-        reader->takeIn(*block);
+        reader->readBlock(*block);
     }
     return reader;
 }
@@ -58,9 +58,9 @@ std::optional<LoggedMessage> PcapngReader::next() {
         if (!block)
             break;
         if (holdsPacket(block->type))
-            takeMessage(*block, message);
+            readMessage(*block, message);
         else
-            takeIn(*block);
+            readBlock(*block);
     }
     return message;
 }
@@ -75,25 +75,25 @@ const PcapngReader::Block* PcapngReader::nextBlock() {
     return block;
 }
 
-void PcapngReader::takeIn(const Block& block) {
+void PcapngReader::readBlock(const Block& block) {
     if (block.type == BlockType::InterfaceDescription) {
-        takeInInterface(block);
+        addInterface(block);
     } else if (block.type == BlockType::SectionHeader) {
         _interfaces.clear();
         ByteReader fields(block.bytes, block.bigEndian);
         // What follows is read as far as it can be understood all the same.
         if (const std::uint16_t major = fields.u16(versionOffset); major != supportedMajorVersion)
-            lose(block, _packets + 1,
-                 "section of format version " + std::to_string(major) + ", wanted " +
-                     std::to_string(supportedMajorVersion));
+            addLossOf(block, _packets + 1,
+                      "section of format version " + std::to_string(major) + ", wanted " +
+                          std::to_string(supportedMajorVersion));
     }
 }
 
-void PcapngReader::takeInInterface(const Block& block) {
+void PcapngReader::addInterface(const Block& block) {
     using Use = Interface::Use;
     if (_interfaces.size() == maximumInterfaces) {
-        lose(block, _packets + 1,
-             "more than " + std::to_string(maximumInterfaces) + " interfaces in a section");
+        addLossOf(block, _packets + 1,
+                  "more than " + std::to_string(maximumInterfaces) + " interfaces in a section");
         return;
     }
     Interface& interface = _interfaces.emplace_back();
@@ -101,9 +101,9 @@ void PcapngReader::takeInInterface(const Block& block) {
         InterfaceDescription::read(block.body(), block.bigEndian);
     if (!description) {
         interface.use = Use::Unreadable;
-        lose(block, _packets + 1,
-             "description of interface " + std::to_string(_interfaces.size() - 1) +
-                 " does not hold its fields");
+        addLossOf(block, _packets + 1,
+                  "description of interface " + std::to_string(_interfaces.size() - 1) +
+                      " does not hold its fields");
         return;
     }
     interface.description = *std::move(description);
@@ -120,7 +120,7 @@ void PcapngReader::takeInInterface(const Block& block) {
         interface.use = Use::OtherTechnology;
 }
 
-void PcapngReader::takeMessage(const Block& block, std::optional<LoggedMessage>& message) {
+void PcapngReader::readMessage(const Block& block, std::optional<LoggedMessage>& message) {
     using Use = Interface::Use;
     const std::uint64_t number = ++_packets;
     const Packet packet = packetOf(block);
@@ -138,7 +138,7 @@ void PcapngReader::takeMessage(const Block& block, std::optional<LoggedMessage>&
         time = packet.hasStamp ? interface->description.time(packet.stamp) : _lastTime;
     if (!time) {
         // Thousands of these are possible; only those that are kept need their words.
-        lose(block, number, keepsLoss() ? whyUnusable(packet, block) : std::string());
+        addLossOf(block, number, keepsLoss() ? packetProblem(packet, block) : std::string());
         return;
     }
     _lastTime = *time;
@@ -173,7 +173,7 @@ PcapngReader::Packet PcapngReader::packetOf(const Block& block) const {
     return packet;
 }
 
-std::string PcapngReader::whyUnusable(const Packet& packet, const Block& block) const {
+std::string PcapngReader::packetProblem(const Packet& packet, const Block& block) const {
     using Use = Interface::Use;
     const std::size_t room = block.length - 4;
     if (packet.offset > room)
@@ -201,7 +201,7 @@ std::string PcapngReader::whyUnusable(const Packet& packet, const Block& block) 
     return "time stamp " + std::to_string(packet.stamp) + " lies outside of the years 1678 to 2262";
 }
 
-void PcapngReader::lose(const Block& block, std::uint64_t number, std::string reason) {
+void PcapngReader::addLossOf(const Block& block, std::uint64_t number, std::string reason) {
     addLoss({block.offset, block.length, number, std::move(reason), false});
 }
 

@@ -69,13 +69,13 @@ private:
     explicit PcapngReader(ChunkedInput input) : _blocks(std::move(input)) {}
 
     [[nodiscard]] const Block* nextBlock();
-    void takeIn(const Block& block);
-    void takeInInterface(const Block& block);
+    void readBlock(const Block& block);
+    void addInterface(const Block& block);
     /// Reads a packet's message, unless the packet is ignored or a loss.
-    void takeMessage(const Block& block, std::optional<LoggedMessage>& message);
+    void readMessage(const Block& block, std::optional<LoggedMessage>& message);
     [[nodiscard]] Packet packetOf(const Block& block) const;
-    [[nodiscard]] std::string whyUnusable(const Packet& packet, const Block& block) const;
-    void lose(const Block& block, std::uint64_t number, std::string reason);
+    [[nodiscard]] std::string packetProblem(const Packet& packet, const Block& block) const;
+    void addLossOf(const Block& block, std::uint64_t number, std::string reason);
 
     BlockReader _blocks;
     const Block* _waiting = nullptr;    ///< the packet that `open` stopped at

@@ -22,7 +22,7 @@ namespace {
 constexpr std::size_t flushThreshold = std::size_t{64} << 10;
 constexpr std::size_t maximumTechnology = 255;
 
-bool mayPass(int error) {
+bool isTemporary(int error) {
     constexpr int passing[] = {ENOSPC, EDQUOT, EFBIG, EIO, EROFS};
     return std::find(std::begin(passing), std::end(passing), error) != std::end(passing);
 }
@@ -52,7 +52,7 @@ Result<std::unique_ptr<PcapngWriter>> PcapngWriter::start(std::unique_ptr<Output
         return Failure{"technology name of " + std::to_string(shortName.size()) + " bytes, wanted at most " +
                        std::to_string(maximumTechnology)};
     pcapngBlocks::appendHead(writer->_buffer, shortName);
-    if (const Result<Done> written = writer->flush(); !written && !writer->isWaiting())
+    if (const Result<Done> written = writer->flush(); !written && !writer->hasTemporaryError())
         return Failure{written.reason()};
     return writer;
 }
@@ -68,32 +68,32 @@ PcapngWriter::~PcapngWriter() {
 }
 
 Result<Done> PcapngWriter::append(Time time, Bytes message) {
-    if (_failure)
-        return *_failure;
+    if (_permanentError)
+        return *_permanentError;
     if (message.size() > maximumMessageSize)
         return Failure{"message of " + std::to_string(message.size()) + " bytes, wanted at most " +
                        std::to_string(maximumMessageSize)};
     const std::size_t length = pcapngBlocks::packetSize(message.size());
     // What has been gathered goes out ahead of a long message, so that the buffer need not hold both.
-    if (!_trouble && !waiting().empty() && waiting().size() + length > 2 * flushThreshold) {
-        if (Result<Done> written = flush(); !written && !_trouble)
+    if (!_temporaryError && !waiting().empty() && waiting().size() + length > 2 * flushThreshold) {
+        if (Result<Done> written = flush(); !written && !_temporaryError)
             return written;
     }
-    _dropping = _dropping || (_trouble && waiting().size() + length > maximumQueue);
+    _dropping = _dropping || (_temporaryError && waiting().size() + length > maximumQueue);
     if (_dropping) {
         ++_dropped;
-        return *_trouble;
+        return *_temporaryError;
     }
     pcapngBlocks::appendPacket(_buffer, time, message);
     ++_messages;
-    return _trouble || waiting().size() < flushThreshold ? outcome() : flush();
+    return _temporaryError || waiting().size() < flushThreshold ? outcome() : flush();
 }
 
 Result<Done> PcapngWriter::flush() {
-    if (_failure)
-        return *_failure;
+    if (_permanentError)
+        return *_permanentError;
     // What a temporary failure has left after the last whole block is cut off first.
-    if (const int error = _trouble ? _file->cutTo(_end) : 0; error != 0) {
+    if (const int error = _temporaryError ? _file->truncateTo(_end) : 0; error != 0) {
         noteFailure("write", error);
         return outcome();
     }
@@ -106,21 +106,21 @@ Result<Done> PcapngWriter::flush() {
         _end += written.bytes;
         rest = rest.subspan(written.bytes);
     }
-    _trouble.reset();
+    _temporaryError.reset();
     _dropping = false;
-    if (!_keeps || written() > maximumKept)
-        forget(written());
+    if (!_keepsUnsynced || written() > maximumUnsynced)
+        discardFront(written());
     return Done{};
 }
 
 Result<Done> PcapngWriter::sync() {
-    _keeps = _file->isRegular();
+    _keepsUnsynced = _file->isRegular();
     // A sync that failed is retried by the next call, so that this one returns the failure.
     if (!collectSync())
         return outcome();
     if (Result<Done> flushed = flush(); !flushed)
         return flushed;
-    if (_keeps && !_syncIsUnderWay && _synced < _end) {
+    if (_keepsUnsynced && !_syncIsUnderWay && _synced < _end) {
         _file->startSync();
         _syncIsUnderWay = true;
         _syncing = _end;
@@ -136,7 +136,7 @@ Result<Done> PcapngWriter::close() {
     if (flushed && _file->isRegular() && !syncNow() && _base == _synced && (flushed = flush()))
         static_cast<void>(syncNow());
     if (const int error = _file->close(); error != 0 && outcome())
-        _failure = failureOf("close", error);
+        _permanentError = failureOf("close", error);
     _file.reset();
     return outcome();
 }
@@ -146,15 +146,15 @@ pcapngBlocks::PacketCount PcapngWriter::unsaved() const {
 }
 
 Result<Done> PcapngWriter::outcome() const {
-    if (_failure)
-        return *_failure;
-    if (_trouble)
-        return *_trouble;
+    if (_permanentError)
+        return *_permanentError;
+    if (_temporaryError)
+        return *_temporaryError;
     return Done{};
 }
 
 bool PcapngWriter::collectSync() {
-    const std::optional<int> error = _syncIsUnderWay ? _file->takeSyncOutcome() : std::nullopt;
+    const std::optional<int> error = _syncIsUnderWay ? _file->takeSyncResult() : std::nullopt;
     if (!error)
         return true;
     _syncIsUnderWay = false;
@@ -168,7 +168,7 @@ bool PcapngWriter::syncNow() {
 
 bool PcapngWriter::applySyncResult(int error, std::uint64_t end) {
     // Some file systems cannot sync, and say so with an error that does not count.
-    if (mayPass(error)) {
+    if (isTemporary(error)) {
         // What has not been synced is written again.
         _end = _base;
         noteFailure("write", error);
@@ -176,20 +176,20 @@ bool PcapngWriter::applySyncResult(int error, std::uint64_t end) {
     }
     _synced = end;
     if (end > _base)
-        forget(static_cast<std::size_t>(end - _base));
+        discardFront(static_cast<std::size_t>(end - _base));
     return true;
 }
 
 void PcapngWriter::noteFailure(const char* operation, int error) {
-    _end = _base + pcapngBlocks::wholeBlocks(_buffer, written());
-    const bool passing = mayPass(error) && _file->isRegular();
-    const int cutError = passing ? _file->cutTo(_end) : 0;
-    if (passing && (cutError == 0 || mayPass(cutError))) {
-        _trouble = failureOf(operation, error);
+    _end = _base + pcapngBlocks::completeBlocks(_buffer, written());
+    const bool passing = isTemporary(error) && _file->isRegular();
+    const int cutError = passing ? _file->truncateTo(_end) : 0;
+    if (passing && (cutError == 0 || isTemporary(cutError))) {
+        _temporaryError = failureOf(operation, error);
         return;
     }
-    _trouble.reset();
-    _failure = failureOf(operation, error);
+    _temporaryError.reset();
+    _permanentError = failureOf(operation, error);
 }
 
 Failure PcapngWriter::failureOf(const char* operation, int error) const {
@@ -197,10 +197,10 @@ Failure PcapngWriter::failureOf(const char* operation, int error) const {
                    std::generic_category().message(error)};
 }
 
-void PcapngWriter::forget(std::size_t length) {
+void PcapngWriter::discardFront(std::size_t length) {
     _buffer.erase(_buffer.begin(), _buffer.begin() + static_cast<std::ptrdiff_t>(length));
     _base += length;
-    if (_buffer.empty() && _buffer.capacity() > maximumKept) { // a long queue's room
+    if (_buffer.empty() && _buffer.capacity() > maximumUnsynced) { // a long queue's room
         _buffer.shrink_to_fit();
         _buffer.reserve(2 * flushThreshold);
     }

@@ -28,7 +28,7 @@ namespace velmora {
 /// back to its last whole block and up to 32 MiB of messages are queued; once the queue is full, further
 /// messages are dropped until the failure is over, so that there is one gap and not many. Until then every
 /// call returns the failure, and each `flush` and `sync` retries. After a permanent failure every call
-/// returns it and nothing more is written. `isWaiting` says which of the two it is.
+/// returns it and nothing more is written. `hasTemporaryError` says which of the two it is.
 ///
 /// Owns its file; destroying it closes it as `close` does, but reports no failure. Main thread only.
 class PcapngWriter {
@@ -36,7 +36,7 @@ public:
     /// How much is queued during a temporary failure, in bytes of blocks.
     static constexpr std::size_t maximumQueue = std::size_t{32} << 20;
     /// How much of what is written but not yet synced is kept, to be written again when the sync fails.
-    static constexpr std::size_t maximumKept = std::size_t{8} << 20;
+    static constexpr std::size_t maximumUnsynced = std::size_t{8} << 20;
 
     /// Creates the file, or empties it; "-" is standard output, which stays open afterwards. The file's head
     /// is written at once. `technology` is a technology's constant or short name, of at most 255 bytes. If
@@ -70,7 +70,7 @@ public:
     /// Messages added that are not in the file.
     [[nodiscard]] pcapngBlocks::PacketCount unsaved() const;
     /// Whether there is a temporary failure.
-    [[nodiscard]] bool isWaiting() const { return _trouble.has_value(); }
+    [[nodiscard]] bool hasTemporaryError() const { return _temporaryError.has_value(); }
     /// Whether messages are being dropped.
     [[nodiscard]] bool isDropping() const { return _dropping; }
 
@@ -91,7 +91,7 @@ private:
     void noteFailure(const char* operation, int error);
     [[nodiscard]] Failure failureOf(const char* operation, int error) const;
     /// Removes the first `length` bytes of the buffer.
-    void forget(std::size_t length);
+    void discardFront(std::size_t length);
 
     std::unique_ptr<OutputFile> _file; ///< null when closed
     std::string _name;
@@ -101,12 +101,12 @@ private:
     std::uint64_t _syncing = 0;        ///< its length when the sync in progress was started
     std::uint64_t _synced = 0;         ///< how much of it has been synced
     bool _syncIsUnderWay = false;
-    bool _keeps = false; ///< `sync` is in use
+    bool _keepsUnsynced = false; ///< `sync` is in use
     bool _dropping = false;
     std::uint64_t _messages = 0;
     std::uint64_t _dropped = 0;
-    std::optional<Failure> _trouble; ///< temporary
-    std::optional<Failure> _failure; ///< permanent
+    std::optional<Failure> _temporaryError; ///< temporary
+    std::optional<Failure> _permanentError; ///< permanent
 };
 
 } // namespace velmora

@@ -56,7 +56,7 @@ private:
 
     ArrayRef _entries; ///< null where there are none
     Time _timestamp{};
-    bool _hasRawMaterial = false; ///< some entry has
+    bool _hasRawMessages = false; ///< some entry has
     bool _isBinary = false;       ///< the first entry with raw messages has bytes
     bool _isLog = false;          ///< the current messages are the DLF log's
     std::size_t _nextEntry = 0;

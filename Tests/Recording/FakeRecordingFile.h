@@ -46,14 +46,14 @@ public:
         return {count, 0};
     }
     [[nodiscard]] bool isRegular() const override { return _medium.isRegular; }
-    int cutTo(std::uint64_t size) override {
+    int truncateTo(std::uint64_t size) override {
         if (_medium.cutError != 0)
             return _medium.cutError;
         _medium.content.resize(static_cast<std::size_t>(size));
         return 0;
     }
     void startSync() override { ++_medium.syncsStarted; }
-    std::optional<int> takeSyncOutcome() override {
+    std::optional<int> takeSyncResult() override {
         const std::optional<int> outcome = _medium.syncOutcome;
         _medium.syncOutcome.reset();
         return outcome;

@@ -27,7 +27,7 @@ namespace velmora {
 [[nodiscard]] std::uint64_t stampAfter(std::uint64_t units);
 
 /// A history entry with these raw messages and that date.
-[[nodiscard]] DictionaryRef historyEntry(Value rawMaterial, std::string_view date);
+[[nodiscard]] DictionaryRef historyEntry(Value rawMessages, std::string_view date);
 /// A snapshot of the entries.
 [[nodiscard]] Value snapshotOf(std::initializer_list<Value> entries);
 /// The same as a file, an XML or a binary property list.

@@ -85,7 +85,7 @@ std::string describe(const LoggedMessage& message) {
 
 std::string describe(const Loss& loss) {
     return "at " + std::to_string(loss.offset) + ", " + std::to_string(loss.bytes) + " bytes, record " +
-           std::to_string(loss.recordNumber) + (loss.isTail ? ", tail: " : ": ") + loss.reason;
+           std::to_string(loss.recordNumber) + (loss.isTruncation ? ", tail: " : ": ") + loss.reason;
 }
 
 ReadOut readOut(const Data& file, std::size_t piece, std::size_t good) {

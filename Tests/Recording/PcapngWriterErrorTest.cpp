@@ -24,9 +24,9 @@ TEST_F(PcapngWriterErrorTest, FullDiskKeepsWholeBlocksAndGoesOnWithoutAGap) {
     medium.room = headSize + 2 * blockSize + 20;
     ASSERT_TRUE(append(2));
     ASSERT_TRUE(append(3));
-    EXPECT_FALSE(writer->isWaiting());
+    EXPECT_FALSE(writer->hasTemporaryError());
     EXPECT_EQ(reasonOf(writer->flush()), full);
-    EXPECT_TRUE(writer->isWaiting());
+    EXPECT_TRUE(writer->hasTemporaryError());
     EXPECT_FALSE(writer->isDropping());
     EXPECT_EQ(medium.content.size(), headSize + 2 * blockSize) << "the part of a block is taken back";
     EXPECT_THAT(numbers(), ElementsAre(1, 2));
@@ -42,7 +42,7 @@ TEST_F(PcapngWriterErrorTest, FullDiskKeepsWholeBlocksAndGoesOnWithoutAGap) {
     medium.room = SIZE_MAX;
     EXPECT_EQ(reasonOf(append(5)), full) << "only a flush tries again";
     ASSERT_TRUE(writer->flush());
-    EXPECT_FALSE(writer->isWaiting());
+    EXPECT_FALSE(writer->hasTemporaryError());
     EXPECT_EQ(writer->unsaved().messages, 0U);
     EXPECT_EQ(writer->droppedMessages(), 0U);
     ASSERT_TRUE(append(6));
@@ -65,7 +65,7 @@ TEST_F(PcapngWriterErrorTest, EveryRoomLeavesWholeBlocks) {
                                          : room < headSize ? 52
                                                            : headSize + blocks * blockSize)
             << room;
-        ASSERT_EQ(writer->isWaiting(), blocks < 3) << room;
+        ASSERT_EQ(writer->hasTemporaryError(), blocks < 3) << room;
         medium.room = SIZE_MAX;
         ASSERT_TRUE(writer->close()) << room;
         ASSERT_THAT(numbers(), ElementsAre(1, 2, 3)) << room;
@@ -80,7 +80,7 @@ TEST_F(PcapngWriterErrorTest, ErrorsThatMayPass) {
         medium.fullError = error;
         ASSERT_TRUE(append(1));
         EXPECT_FALSE(writer->flush()) << error;
-        EXPECT_TRUE(writer->isWaiting()) << error;
+        EXPECT_TRUE(writer->hasTemporaryError()) << error;
     }
 }
 
@@ -91,7 +91,7 @@ TEST_F(PcapngWriterErrorTest, OtherErrorsAreForGood) {
     medium.fullError = EBADF;
     const std::string reason = "cannot write the recording: Bad file descriptor";
     EXPECT_EQ(reasonOf(writer->flush()), reason);
-    EXPECT_FALSE(writer->isWaiting());
+    EXPECT_FALSE(writer->hasTemporaryError());
     medium.room = SIZE_MAX;
     EXPECT_EQ(reasonOf(append(2)), reason);
     EXPECT_EQ(reasonOf(writer->flush()), reason);
@@ -107,7 +107,7 @@ TEST_F(PcapngWriterErrorTest, WhatCannotBeTakenBackIsForGood) {
     ASSERT_TRUE(append(1));
     medium.room = headSize + 5;
     EXPECT_EQ(reasonOf(writer->flush()), full);
-    EXPECT_FALSE(writer->isWaiting());
+    EXPECT_FALSE(writer->hasTemporaryError());
     EXPECT_EQ(medium.content.size(), headSize + 5);
     medium.room = SIZE_MAX;
     EXPECT_EQ(reasonOf(writer->flush()), full);
@@ -120,7 +120,7 @@ TEST_F(PcapngWriterErrorTest, NothingIsWrittenBehindAPartThatCannotBeTakenBackYe
     medium.room = headSize + 5;
     medium.cutError = EIO;
     EXPECT_EQ(reasonOf(writer->flush()), full);
-    EXPECT_TRUE(writer->isWaiting());
+    EXPECT_TRUE(writer->hasTemporaryError());
     medium.room = SIZE_MAX;
     EXPECT_EQ(reasonOf(writer->flush()), broken);
     EXPECT_EQ(medium.content.size(), headSize + 5);
@@ -132,7 +132,7 @@ TEST_F(PcapngWriterErrorTest, NothingIsWrittenBehindAPartThatCannotBeTakenBackYe
 TEST_F(PcapngWriterErrorTest, HeadMayWaitToo) {
     medium.room = 60;
     start();
-    EXPECT_TRUE(writer->isWaiting());
+    EXPECT_TRUE(writer->hasTemporaryError());
     EXPECT_EQ(reasonOf(append(1)), full);
     EXPECT_EQ(writer->unsaved().messages, 1U);
     medium.room = SIZE_MAX;

@@ -47,11 +47,11 @@ TEST_F(RecordingSyncTest, WhatTheMediumLostIsWrittenOnceMore) {
     // The second message was never synced, and the third is unknown.
     medium.syncOutcome = EIO;
     EXPECT_EQ(reasonOf(writer->sync()), broken);
-    EXPECT_TRUE(writer->isWaiting());
+    EXPECT_TRUE(writer->hasTemporaryError());
     EXPECT_THAT(numbers(), ElementsAre(1));
     EXPECT_EQ(writer->unsaved().messages, 2U);
     ASSERT_TRUE(writer->sync());
-    EXPECT_FALSE(writer->isWaiting());
+    EXPECT_FALSE(writer->hasTemporaryError());
     EXPECT_EQ(medium.syncsStarted, 3U);
     EXPECT_THAT(numbers(), ElementsAre(1, 2, 3));
 }

@@ -118,7 +118,7 @@ Result<Done> RecordingSession::save() {
 }
 
 Result<Done> RecordingSession::unlessItMayPass(Result<Done> result) {
-    const bool waiting = _writer->isWaiting();
+    const bool waiting = _writer->hasTemporaryError();
     if (!waiting)
         _trouble.clear();
     else if (!result)

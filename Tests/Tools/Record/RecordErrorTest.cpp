@@ -211,7 +211,7 @@ TEST_F(RecordErrorTest, KilledRecorderLacksTheLastSecondAtMost) {
         }
         // The kill may have cut the write that it met.
         for (const Loss& loss : (*reader)->losses())
-            EXPECT_TRUE(loss.isTail) << victim.name << ": " << loss.reason;
+            EXPECT_TRUE(loss.isTruncation) << victim.name << ": " << loss.reason;
         std::size_t due = 0;
         while (due < sent.size() && sent[due] < victim.killed - std::chrono::seconds(1))
             ++due;
