@@ -5,7 +5,7 @@
 #include "App/SelfTest.h"
 #include "App/VelmoraApp.h"
 #include "Platform/Linux/Files/FileResources.h"
-#include "Platform/Linux/Files/LargeMemory.h"
+#include "Platform/Linux/Files/LargeAllocations.h"
 #include "Platform/Linux/Files/LinuxFileSystem.h"
 #include "Platform/Linux/ProgramLog.h"
 #include "Platform/Linux/ServiceStarter.h"
@@ -79,7 +79,7 @@ int show(const Options& options, char* program) {
                    [&options] { return std::make_unique<LinuxAppPlatform>(options.files); });
     if (options.startsService) {
         // Before the first attempt to connect, since the next one comes seconds later.
-        if (const auto up = bringUpTelephonyService(); !up)
+        if (const auto up = startTelephonyService(); !up)
             logFormat(LogPriority::Error, "telephony service: %s", up.reason().c_str());
     }
     app.platform().model().queue.after(serviceDelay, [&app] {
@@ -98,7 +98,7 @@ int show(const Options& options, char* program) {
 
 int main(int argc, char** argv) {
     endOnUncaughtExceptions("velmora");
-    giveBackLargeMemory();
+    returnLargeAllocations();
     Options options;
     CLI::App app;
     declare(app, options);

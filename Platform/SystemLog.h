@@ -36,13 +36,13 @@ void writeToSystemLog(int priority, std::string_view text);
 } // namespace detail
 
 /// Whether a line of this priority would be written at all.
-[[nodiscard]] inline bool systemLogWants(int priority) {
+[[nodiscard]] inline bool isLogged(int priority) {
     return (priority & 7) <= detail::systemLogLevel;
 }
 
 /// Writes the text unchanged.
 inline void logLine(int priority, std::string_view text) {
-    if (systemLogWants(priority))
+    if (isLogged(priority))
         detail::writeToSystemLog(priority, text);
 }
 

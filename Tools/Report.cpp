@@ -63,7 +63,7 @@ void WorkContext::takeOverTermination() {
 
 void WorkContext::terminate() noexcept {
     // Nothing here asks for memory, since there may be none left.
-    const char* const reason = reasonOfTermination();
+    const char* const reason = terminationReason();
     const WorkContext* const context = currentContext;
     if (!context)
         std::snprintf(lastWords, sizeof lastWords, "velmora-log: %s\n", reason);

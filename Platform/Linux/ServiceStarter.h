@@ -14,6 +14,6 @@ namespace velmora {
 /// "velmora-telephonyd" as a process of its own, which outlives this one. Blocks for up to `patience` for
 /// each of the two ways. What was started is a log line; the failure is that of the last way. Main thread
 /// only, on its event loop.
-Result<Done> bringUpTelephonyService(std::chrono::milliseconds patience = std::chrono::seconds(5));
+Result<Done> startTelephonyService(std::chrono::milliseconds patience = std::chrono::seconds(5));
 
 } // namespace velmora

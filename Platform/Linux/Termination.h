@@ -12,7 +12,7 @@ namespace velmora {
 
 /// The reason, for a terminate handler: "out of memory", the exception's what(), or that there is no
 /// exception. Valid until the program ends.
-[[nodiscard]] const char* reasonOfTermination() noexcept;
+[[nodiscard]] const char* terminationReason() noexcept;
 
 /// Writes the text to standard error, ignoring errors.
 void writeToStandardError(std::string_view text) noexcept;

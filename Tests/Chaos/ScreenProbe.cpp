@@ -5,7 +5,7 @@
 #include "App/VelmoraApp.h"
 #include "Platform/Console.h"
 #include "Platform/Linux/Files/FileResources.h"
-#include "Platform/Linux/Files/LargeMemory.h"
+#include "Platform/Linux/Files/LargeAllocations.h"
 #include "Platform/Linux/ProgramLog.h"
 #include "Platform/Linux/Termination.h"
 
@@ -78,7 +78,7 @@ private:
 int main(int argc, char** argv) {
     using namespace velmora;
     endOnUncaughtExceptions("screen-probe");
-    giveBackLargeMemory();
+    returnLargeAllocations();
     redirectConsole(stderr);
     const ProgramLog log(LogKind::Stderr, LogPriority::Error, "screen-probe");
     FileResources files;

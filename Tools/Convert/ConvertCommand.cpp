@@ -3,7 +3,7 @@
 
 #include "Tools/Convert/ConvertCommand.h"
 
-#include "Platform/Linux/Files/FileDraft.h"
+#include "Platform/Linux/Files/AtomicFile.h"
 #include "Recording/OpenMessages.h"
 #include "Tools/Convert/Conversion.h"
 #include "Tools/Decode/Decoding.h"
@@ -89,12 +89,12 @@ std::optional<std::uint64_t> refreshesOf(const std::string& file) {
 /// Whether all of the input is in the output now.
 bool convert(const ConvertOptions& options, MessageReader& reader, const std::string& title) {
     // Before the draft, so that an allocation that fails never leaves one on the disk.
-    FileDraft* made = nullptr;
+    AtomicFile* made = nullptr;
     WorkContext context(title, [&made] {
         if (made)
             made->discard();
     });
-    Result<FileDraft> draft = FileDraft::create(options.out, newFileMode);
+    Result<AtomicFile> draft = AtomicFile::create(options.out, newFileMode);
     if (!draft) {
         report(options.out + ": " + draft.reason());
         return false;
@@ -114,8 +114,8 @@ bool convert(const ConvertOptions& options, MessageReader& reader, const std::st
         report(converted.reason());
         return false;
     }
-    using WhereThereIsOne = FileDraft::WhereThereIsOne;
-    const auto published = draft->publish(options.force ? WhereThereIsOne::Replace : WhereThereIsOne::Refuse);
+    using IfExists = AtomicFile::IfExists;
+    const auto published = draft->publish(options.force ? IfExists::Replace : IfExists::Refuse);
     if (!published)
         report(options.out + ": " + published.reason());
     return published && *converted;

@@ -3,7 +3,7 @@
 
 #include "Tools/Record/RecordingSession.h"
 
-#include "Platform/Linux/Files/FileDraft.h"
+#include "Platform/Linux/Files/AtomicFile.h"
 #include "Platform/TelephonyService.h"
 #include "Tools/Report.h"
 
@@ -71,13 +71,13 @@ Result<Done> RecordingSession::learnTechnology(std::string_view technology) {
     if (_writer)
         return Done{};
     // A file that is to be overwritten stays as it is until the new one has its head.
-    std::optional<FileDraft> draft;
+    std::optional<AtomicFile> draft;
     if (isFilledFile(_file.get())) {
         std::error_code error;
         std::filesystem::path place = std::filesystem::canonical(_path, error); // a symbolic link stays one
         if (error)
             place = _path;
-        Result<FileDraft> made = FileDraft::create(place, newFileMode);
+        Result<AtomicFile> made = AtomicFile::create(place, newFileMode);
         if (!made)
             return Failure{_path + ": " + made.reason()};
         draft.emplace(*std::move(made));
@@ -95,7 +95,7 @@ Result<Done> RecordingSession::learnTechnology(std::string_view technology) {
     if (draft) {
         if (Result<Done> written = (*writer)->flush(); !written) // the head may be waiting
             return written;
-        if (const Result<Done> published = draft->publish(FileDraft::WhereThereIsOne::Replace); !published)
+        if (const Result<Done> published = draft->publish(AtomicFile::IfExists::Replace); !published)
             return Failure{_path + ": " + published.reason()};
     }
     _writer = *std::move(writer);

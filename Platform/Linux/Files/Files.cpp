@@ -4,8 +4,8 @@
 #include "Platform/Linux/Files/Files.h"
 
 #include "Platform/Linux/Errno.h"
+#include "Platform/Linux/Files/AtomicFile.h"
 #include "Platform/Linux/Files/FileDescriptor.h"
-#include "Platform/Linux/Files/FileDraft.h"
 
 #include <fcntl.h>
 #include <sys/stat.h>
@@ -64,12 +64,12 @@ Result<Done> writeFile(const std::filesystem::path& path, Bytes content) {
 }
 
 Result<Done> replaceFile(const std::filesystem::path& path, Bytes content) {
-    Result<FileDraft> draft = FileDraft::create(path, S_IRUSR | S_IWUSR);
+    Result<AtomicFile> draft = AtomicFile::create(path, S_IRUSR | S_IWUSR);
     if (!draft)
         return Failure{draft.reason()};
     if (auto written = writeAll(draft->descriptor(), content); !written)
         return written;
-    return draft->publish(FileDraft::WhereThereIsOne::Replace);
+    return draft->publish(AtomicFile::IfExists::Replace);
 }
 
 } // namespace velmora

@@ -33,9 +33,9 @@ public:
     /// maximum.
     [[nodiscard]] std::size_t push(const Frame& frame);
     /// Appends the frame regardless of the limits. Same precondition.
-    void pushRegardless(const Frame& frame);
+    void pushUnbounded(const Frame& frame);
     /// Removes the newest frame; false when part of it is already written, so that the rest has to follow.
-    bool withdrawNewest();
+    bool removeNewest();
 
     /// Writes what the non-blocking socket takes, several frames a system call, a mebibyte or so a call.
     [[nodiscard]] Flushed flush(int descriptor);
@@ -54,7 +54,7 @@ private:
 
     /// Drops the oldest frame that is not partly written. Precondition: there is one.
     void dropOldest();
-    void taken(std::size_t count);
+    void consume(std::size_t count);
 
     Limits _limits;
     std::deque<Waiting> _waiting;

@@ -52,7 +52,7 @@ private:
     /// The reply with that serial out of what has arrived; others are late and are discarded. A malformed
     /// frame ends the connection.
     [[nodiscard]] std::optional<Frame> takeReply(std::uint32_t serial);
-    void takeWhatArrived();
+    void readAvailable();
     void flushQueue();
     void countDropped(std::uint64_t count);
     void reportDropped();

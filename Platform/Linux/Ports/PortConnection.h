@@ -36,7 +36,7 @@ public:
     void send(const Frame& frame);
     /// Whether so many replies wait for a peer that does not take them that no more may be made: its requests
     /// are not read until it does, so that it cannot fill this process's memory.
-    [[nodiscard]] bool isClogged() const;
+    [[nodiscard]] bool hasReplyBacklog() const;
 
     /// Set by the port while the connection stands in its list of connections to serve.
     bool queued = false;

@@ -29,13 +29,13 @@ struct PortOptions {
     /// How long connecting may block when the peer's queue of new connections is full.
     std::chrono::nanoseconds connectTimeout = std::chrono::seconds(1);
     /// How long connecting may block when the port's owner has crashed, in case it is being restarted.
-    std::chrono::nanoseconds restartPatience{0};
+    std::chrono::nanoseconds restartTimeout{0};
 
     /// For clients of a service, which retry only seconds later: blocking briefly catches a service that
     /// restarts at once.
     [[nodiscard]] static PortOptions forClients() {
         PortOptions options;
-        options.restartPatience = std::chrono::milliseconds(500);
+        options.restartTimeout = std::chrono::milliseconds(500);
         return options;
     }
 

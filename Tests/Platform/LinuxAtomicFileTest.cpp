@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Platform/Linux/Files/FileDraft.h"
+#include "Platform/Linux/Files/AtomicFile.h"
 
 #include "Platform/Linux/Files/Files.h"
 #include "Tests/Support/TemporaryDirectory.h"
@@ -22,12 +22,12 @@ namespace {
 
 using testing::ElementsAre;
 using testing::UnorderedElementsAre;
-using WhereThereIsOne = FileDraft::WhereThereIsOne;
+using IfExists = AtomicFile::IfExists;
 
-class LinuxFileDraftTest : public testing::Test {
+class LinuxAtomicFileTest : public testing::Test {
 protected:
-    [[nodiscard]] FileDraft create(const std::string& name, const std::string& content) const {
-        Result<FileDraft> draft = FileDraft::create(directory / name, 0666);
+    [[nodiscard]] AtomicFile create(const std::string& name, const std::string& content) const {
+        Result<AtomicFile> draft = AtomicFile::create(directory / name, 0666);
         EXPECT_TRUE(draft) << draft.reason();
         EXPECT_TRUE(writeAll(draft->descriptor(),
                              Bytes(reinterpret_cast<const std::uint8_t*>(content.data()), content.size())));
@@ -47,58 +47,58 @@ protected:
     TemporaryDirectory directory;
 };
 
-TEST_F(LinuxFileDraftTest, TakesItsPlaceInTheEnd) {
-    FileDraft draft = create("out", "text");
+TEST_F(LinuxAtomicFileTest, TakesItsPlaceInTheEnd) {
+    AtomicFile draft = create("out", "text");
     EXPECT_EQ(std::filesystem::path(draft.path()).parent_path(), directory.path()) << "on the same disk";
     EXPECT_EQ(names().size(), 1U);
     EXPECT_FALSE(std::filesystem::exists(directory / "out"));
-    ASSERT_TRUE(draft.publish(WhereThereIsOne::Refuse));
+    ASSERT_TRUE(draft.publish(IfExists::Refuse));
     EXPECT_EQ(content("out"), "text");
     EXPECT_THAT(names(), ElementsAre("out"));
 }
 
-TEST_F(LinuxFileDraftTest, IsRemovedUnlessItIsPublished) {
+TEST_F(LinuxAtomicFileTest, IsRemovedUnlessItIsPublished) {
     {
-        const FileDraft draft = create("out", "text");
+        const AtomicFile draft = create("out", "text");
         EXPECT_EQ(names().size(), 1U);
     }
     EXPECT_THAT(names(), ElementsAre());
-    FileDraft draft = create("out", "text");
-    const FileDraft moved = std::move(draft);
+    AtomicFile draft = create("out", "text");
+    const AtomicFile moved = std::move(draft);
     draft.discard(); // NOLINT(bugprone-use-after-move) which is what is tested
     EXPECT_EQ(names().size(), 1U) << "the other one has it";
 }
 
-TEST_F(LinuxFileDraftTest, ReplacesOrRefuses) {
+TEST_F(LinuxAtomicFileTest, ReplacesOrRefuses) {
     std::ofstream(directory / "out") << "earlier";
-    FileDraft refused = create("out", "text");
-    const auto result = refused.publish(WhereThereIsOne::Refuse);
+    AtomicFile refused = create("out", "text");
+    const auto result = refused.publish(IfExists::Refuse);
     ASSERT_FALSE(result);
     EXPECT_EQ(result.reason(), "cannot be replaced: File exists");
     EXPECT_EQ(content("out"), "earlier");
     EXPECT_THAT(names(), ElementsAre("out"));
-    ASSERT_TRUE(create("out", "text").publish(WhereThereIsOne::Replace));
+    ASSERT_TRUE(create("out", "text").publish(IfExists::Replace));
     EXPECT_EQ(content("out"), "text");
     EXPECT_THAT(names(), ElementsAre("out"));
 }
 
-TEST_F(LinuxFileDraftTest, HasThePermissionsOfTheFileOrTheUsualOnes) {
+TEST_F(LinuxAtomicFileTest, HasThePermissionsOfTheFileOrTheUsualOnes) {
     const mode_t earlier = ::umask(0027);
-    ASSERT_TRUE(create("new", "").publish(WhereThereIsOne::Refuse));
+    ASSERT_TRUE(create("new", "").publish(IfExists::Refuse));
     ::umask(earlier);
     EXPECT_EQ(std::filesystem::status(directory / "new").permissions(), std::filesystem::perms(0640));
     std::filesystem::permissions(directory / "new", std::filesystem::perms(0604));
-    ASSERT_TRUE(create("new", "").publish(WhereThereIsOne::Replace));
+    ASSERT_TRUE(create("new", "").publish(IfExists::Replace));
     EXPECT_EQ(std::filesystem::status(directory / "new").permissions(), std::filesystem::perms(0604));
 }
 
-TEST_F(LinuxFileDraftTest, TellsWhereItCannotBe) {
-    const auto draft = FileDraft::create(directory / "none/out", 0666);
+TEST_F(LinuxAtomicFileTest, TellsWhereItCannotBe) {
+    const auto draft = AtomicFile::create(directory / "none/out", 0666);
     ASSERT_FALSE(draft);
     EXPECT_EQ(draft.reason(), "cannot be opened for writing: No such file or directory");
     std::filesystem::create_directories(directory / "taken/by");
-    FileDraft overDirectory = create("taken", "text");
-    const auto result = overDirectory.publish(WhereThereIsOne::Replace);
+    AtomicFile overDirectory = create("taken", "text");
+    const auto result = overDirectory.publish(IfExists::Replace);
     ASSERT_FALSE(result);
     EXPECT_EQ(result.reason(), "cannot be replaced: Is a directory");
     EXPECT_THAT(names(), UnorderedElementsAre("taken"));

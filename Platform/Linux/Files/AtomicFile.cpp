@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Platform/Linux/Files/FileDraft.h"
+#include "Platform/Linux/Files/AtomicFile.h"
 
 #include "Platform/Linux/Errno.h"
 
@@ -23,8 +23,8 @@ mode_t maskOfProcess() {
     return mask;
 }
 
-bool rename(const std::string& from, const std::filesystem::path& to, FileDraft::WhereThereIsOne choice) {
-    if (choice == FileDraft::WhereThereIsOne::Replace)
+bool rename(const std::string& from, const std::filesystem::path& to, AtomicFile::IfExists choice) {
+    if (choice == AtomicFile::IfExists::Replace)
         return ::rename(from.c_str(), to.c_str()) == 0;
     if (::renameat2(AT_FDCWD, from.c_str(), AT_FDCWD, to.c_str(), RENAME_NOREPLACE) == 0)
         return true;
@@ -41,10 +41,10 @@ bool rename(const std::string& from, const std::filesystem::path& to, FileDraft:
 
 } // namespace
 
-Result<FileDraft> FileDraft::create(const std::filesystem::path& target, mode_t mode) {
+Result<AtomicFile> AtomicFile::create(const std::filesystem::path& target, mode_t mode) {
     // Once the file exists nothing here may throw until the draft owns it: the file would be left over.
     std::string path = target.string() + ".XXXXXX";
-    FileDraft draft(target, {}, {});
+    AtomicFile draft(target, {}, {});
     draft._file = FileDescriptor(::mkostemp(path.data(), O_CLOEXEC));
     if (!draft._file)
         return Failure{"cannot be opened for writing: " + errnoText(errno)};
@@ -56,14 +56,14 @@ Result<FileDraft> FileDraft::create(const std::filesystem::path& target, mode_t 
     return draft;
 }
 
-FileDraft::FileDraft(std::filesystem::path target, std::string path, FileDescriptor file)
+AtomicFile::AtomicFile(std::filesystem::path target, std::string path, FileDescriptor file)
     : _target(std::move(target)), _path(std::move(path)), _file(std::move(file)) {}
 
-FileDraft::FileDraft(FileDraft&& other) noexcept
+AtomicFile::AtomicFile(AtomicFile&& other) noexcept
     : _target(std::move(other._target)), _path(std::exchange(other._path, {})),
       _file(std::move(other._file)) {}
 
-Result<Done> FileDraft::publish(WhereThereIsOne choice) {
+Result<Done> AtomicFile::publish(IfExists choice) {
     // The content is on the disk before the name leads to it.
     if (::fsync(_file.get()) != 0 || !rename(_path, _target, choice)) {
         const Failure failure{"cannot be replaced: " + errnoText(errno)};
@@ -75,7 +75,7 @@ Result<Done> FileDraft::publish(WhereThereIsOne choice) {
     return Done();
 }
 
-void FileDraft::discard() {
+void AtomicFile::discard() {
     if (!_path.empty())
         ::unlink(std::exchange(_path, {}).c_str());
     _file.reset();

@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Platform/Linux/Files/LargeMemory.h"
+#include "Platform/Linux/Files/LargeAllocations.h"
 
 #include <malloc.h>
 
@@ -14,7 +14,7 @@ constexpr int smallestLargePiece = 128 * 1024;
 
 } // namespace
 
-void giveBackLargeMemory() {
+void returnLargeAllocations() {
 #ifdef M_MMAP_THRESHOLD // not every C library keeps any
     ::mallopt(M_MMAP_THRESHOLD, smallestLargePiece);
 #endif

@@ -16,15 +16,15 @@ namespace velmora {
 /// A file in the making: it is written beside the one whose place it takes in the end, in one step, so that a
 /// failure leaves what was there and no part of it is ever visible. A draft that is not published is removed.
 /// Reasons are ready to follow "file: ".
-class FileDraft {
+class AtomicFile {
 public:
-    enum class WhereThereIsOne { Replace, Refuse };
+    enum class IfExists { Replace, Refuse };
 
     /// `mode`: the permissions of a new file, less the process's umask; an existing file's are kept.
-    static Result<FileDraft> create(const std::filesystem::path& target, mode_t mode);
-    ~FileDraft() { discard(); }
-    FileDraft(FileDraft&& other) noexcept;
-    FileDraft& operator=(FileDraft&&) = delete;
+    static Result<AtomicFile> create(const std::filesystem::path& target, mode_t mode);
+    ~AtomicFile() { discard(); }
+    AtomicFile(AtomicFile&& other) noexcept;
+    AtomicFile& operator=(AtomicFile&&) = delete;
 
     /// The descriptor to write the content to; still owned by this.
     [[nodiscard]] int descriptor() const { return _file.get(); }
@@ -33,12 +33,12 @@ public:
 
     /// Syncs the content to storage and renames it. The temporary file is gone afterwards, whatever the
     /// outcome.
-    Result<Done> publish(WhereThereIsOne choice);
+    Result<Done> publish(IfExists choice);
     /// Removes the temporary file.
     void discard();
 
 private:
-    FileDraft(std::filesystem::path target, std::string path, FileDescriptor file);
+    AtomicFile(std::filesystem::path target, std::string path, FileDescriptor file);
 
     std::filesystem::path _target;
     std::string _path; ///< empty once it is committed or discarded

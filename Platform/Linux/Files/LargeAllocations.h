@@ -8,6 +8,6 @@ namespace velmora {
 /// For a program that decodes live, called once at its start: large allocations are returned to the system as
 /// soon as they are freed. By default the C library raises its mmap threshold whenever one is freed and keeps
 /// the next in its heap, which the messages of each refresh would then fragment for hours.
-void giveBackLargeMemory();
+void returnLargeAllocations();
 
 } // namespace velmora
