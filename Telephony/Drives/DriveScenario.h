@@ -3,11 +3,11 @@
 
 #pragma once
 
-#include "Telephony/Drives/DamagedRecords.h"
 #include "Telephony/Drives/DriveScript.h"
 #include "Telephony/Drives/PeriodicReport.h"
 #include "Telephony/Drives/Scenario.h"
 #include "Telephony/Drives/ScenarioRandom.h"
+#include "Telephony/Drives/UnusualMessages.h"
 
 #include <cmath>
 #include <cstddef>
@@ -19,7 +19,7 @@ namespace velmora {
 
 /// Common base of the drives whose messages are log records: the car moves in steps of a measurement period;
 /// a round of phases, each with its procedure, repeats; procedures add steps to a script; the modem's reports
-/// are sent periodically; and about every ten seconds a message is unusual (see Damage). A technology
+/// are sent periodically; and about every ten seconds a message is unusual (see UnusualMessage). A technology
 /// provides its network, its phone, its phases, reports and records.
 ///
 /// Everything depends only on the seed: the same seed gives the same bytes. Records are stamped as if the
@@ -33,7 +33,7 @@ public:
     [[nodiscard]] ScenarioEvent next() final;
 
     /// When the drive begins by the records' time stamps.
-    [[nodiscard]] static Time beginning();
+    [[nodiscard]] static Time startTime();
 
 protected:
     /// A phase of the round starts with a procedure of the scenario `Kind`, where it has one, and lasts
@@ -59,9 +59,9 @@ protected:
     virtual void addReports(DriveScript& due) = 0;
     /// Called before each step, with its time. The default is for technologies without counters.
     virtual void countUntil(double at);
-    /// What is spoilt for the odd message of that number, from 0 on: its kind is everyDamage's element
+    /// What is spoilt for the odd message of that number, from 0 on: its kind is allUnusualMessages's element
     /// `number` modulo their count.
-    [[nodiscard]] virtual DamageMaterial damageMaterial(std::size_t number) = 0;
+    [[nodiscard]] virtual UnusualMessageParts unusualMessageParts(std::size_t number) = 0;
 
     /// Seconds from the start.
     [[nodiscard]] double now() const { return _now; }
@@ -69,7 +69,7 @@ protected:
     /// The remaining steps of the procedures.
     [[nodiscard]] DriveScript& script() { return _script; }
     /// Adds a step that many seconds from now.
-    void say(double delay, DriveStep step) { _script.emplace(_now + delay, std::move(step)); }
+    void addStep(double delay, DriveStep step) { _script.emplace(_now + delay, std::move(step)); }
     /// To be called after each measurement with whether another cell is better: whether one has been for
     /// `after_s`, so that the phone reselects it. That restarts the time.
     [[nodiscard]] bool timeToReselect(bool better, double after_s);
@@ -86,7 +86,7 @@ private:
     /// Adds the next step's messages to `_events`; there may be none.
     void advance();
     void followTimeline();
-    void addDamage();
+    void addUnusualMessage();
     void send(double at, const std::optional<RecordBuilder>& record);
     /// The offset of that second; never before the last one given.
     [[nodiscard]] std::chrono::nanoseconds offsetOf(double at);
@@ -98,8 +98,8 @@ private:
     std::size_t _phase = 0;
     double _phaseEnd = 0;
     double _betterSince = 0; ///< since when some cell has been better than the serving one
-    double _nextDamage = 5;
-    std::size_t _damage = 0; ///< number of unusual messages so far
+    double _nextUnusual = 5;
+    std::size_t _unusualCount = 0; ///< number of unusual messages so far
     std::chrono::nanoseconds _lastOffset{0};
     std::deque<ScenarioEvent> _events;
 };

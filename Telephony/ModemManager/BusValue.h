@@ -29,6 +29,6 @@ inline constexpr int depth = 12;            ///< of containers in containers
 [[nodiscard]] Value busValue(const QVariant& content);
 
 /// External text made safe for a log line: truncated to 200 bytes, control characters as question marks.
-[[nodiscard]] std::string quotable(std::string_view text);
+[[nodiscard]] std::string printableForLog(std::string_view text);
 
 } // namespace velmora

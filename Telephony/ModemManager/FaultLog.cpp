@@ -8,7 +8,7 @@
 namespace velmora {
 
 void FaultLog::tell(std::string_view subject, const std::string& text) {
-    std::string& told = _told[std::string(subject)];
+    std::string& told = _reported[std::string(subject)];
     if (told == text)
         return;
     told = text;
@@ -16,8 +16,8 @@ void FaultLog::tell(std::string_view subject, const std::string& text) {
 }
 
 void FaultLog::over(std::string_view subject) {
-    if (const auto told = _told.find(subject); told != _told.end())
-        _told.erase(told);
+    if (const auto told = _reported.find(subject); told != _reported.end())
+        _reported.erase(told);
 }
 
 } // namespace velmora

@@ -20,7 +20,7 @@ public:
     void over(std::string_view subject);
 
 private:
-    std::map<std::string, std::string, std::less<>> _told; ///< the last text by subject
+    std::map<std::string, std::string, std::less<>> _reported; ///< the last text by subject
 };
 
 } // namespace velmora

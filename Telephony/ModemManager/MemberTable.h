@@ -13,19 +13,19 @@ namespace velmora {
 
 /// The interface or dictionary of a member of ModemManager's.
 enum class MemberOf : std::uint8_t {
-    AnyCell,    ///< a cell of GetCellInfo, of any type
-    GSMCell,    ///< one of type GSM
-    UMTSCell,   ///< UMTS
-    LTECell,    ///< LTE
-    OtherCell,  ///< CDMA, TD-SCDMA or 5G NR
-    CSPlace,    ///< a part of GetLocation's text "MCC,MNC,LAC,CI,TAC", while registered on GSM or UMTS
-    EPSPlace,   ///< the same while registered on LTE
-    GSMSignal,  ///< the dictionary Modem.Signal.Gsm, and so on
-    UMTSSignal, ///<
-    LTESignal,  ///<
-    NRSignal,   ///<
-    CDMASignal, ///< Cdma and Evdo
-    Modem,      ///< the interface Modem
+    AnyCell,     ///< a cell of GetCellInfo, of any type
+    GSMCell,     ///< one of type GSM
+    UMTSCell,    ///< UMTS
+    LTECell,     ///< LTE
+    OtherCell,   ///< CDMA, TD-SCDMA or 5G NR
+    CSLocation,  ///< a part of GetLocation's text "MCC,MNC,LAC,CI,TAC", while registered on GSM or UMTS
+    EPSLocation, ///< the same while registered on LTE
+    GSMSignal,   ///< the dictionary Modem.Signal.Gsm, and so on
+    UMTSSignal,  ///<
+    LTESignal,   ///<
+    NRSignal,    ///<
+    CDMASignal,  ///< Cdma and Evdo
+    Modem,       ///< the interface Modem
     Modem3gpp,
     Location, ///< Modem.Location
     Signal,   ///< Modem.Signal, but for its dictionaries

@@ -16,7 +16,7 @@ constexpr std::string_view presence = "presence"; ///< of bus, ModemManager and 
 
 std::string textOf(const Modem& modem, std::string_view property) {
     const std::string* text = modem[mm::modem][property].asString();
-    return text && !text->empty() ? ' ' + quotable(*text) : std::string();
+    return text && !text->empty() ? ' ' + printableForLog(*text) : std::string();
 }
 
 std::string absence(const BusReply& reply) {

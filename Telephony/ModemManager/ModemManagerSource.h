@@ -26,7 +26,7 @@ public:
     ModemManagerSource(MainQueue& queue, const Clock& clock, ModemFollower::Options options);
 
     [[nodiscard]] std::string_view technology() const override { return _technology; }
-    void whenTechnologyChanges(std::function<void()> changed) override { _changed = std::move(changed); }
+    void setTechnologyCallback(std::function<void()> changed) override { _changed = std::move(changed); }
     void start(LogSink& sink) override;
     void stop() override;
 

@@ -26,11 +26,11 @@ struct RadioKind {
 // In order of their generation: a modem that is on several of them at once shows its place on the last.
 constexpr RadioKind radioKinds[] = {
     {mm::CellType::GSM, mm::Access::GSM, kVoxCellMonitorRadioAccessTechnologyGSM, MemberOf::GSMCell,
-     MemberOf::CSPlace, MemberOf::GSMSignal, "Gsm"},
+     MemberOf::CSLocation, MemberOf::GSMSignal, "Gsm"},
     {mm::CellType::UMTS, mm::Access::UMTS, kVoxCellMonitorRadioAccessTechnologyUMTS, MemberOf::UMTSCell,
-     MemberOf::CSPlace, MemberOf::UMTSSignal, "Umts"},
+     MemberOf::CSLocation, MemberOf::UMTSSignal, "Umts"},
     {mm::CellType::LTE, mm::Access::LTE, kVoxCellMonitorRadioAccessTechnologyLTE, MemberOf::LTECell,
-     MemberOf::EPSPlace, MemberOf::LTESignal, "Lte"},
+     MemberOf::EPSLocation, MemberOf::LTESignal, "Lte"},
 };
 
 std::int64_t bitsOf(const Modem& modem, std::string_view member) {

@@ -62,17 +62,17 @@ void ModemSession::call(const BusCall& call, std::function<void(const BusReply&)
 }
 
 void ModemSession::turn() {
-    if (_partTurns > 0 && --_partTurns == 0)
+    if (_partPolls > 0 && --_partPolls == 0)
         for (const auto& [path, part] : _parts)
             if (!part.properties)
                 readPart(path);
-    askCells();
+    requestCells();
 }
 
-void ModemSession::askCells() {
+void ModemSession::requestCells() {
     if (_cellQuestion.turns > 0) {
         --_cellQuestion.turns;
-        return askPlace({});
+        return askLocation({});
     }
     call({.path = _path,
           .interface = mm::modem,
@@ -82,51 +82,51 @@ void ModemSession::askCells() {
          [this](const BusReply& reply) {
              if (reply.failed()) {
                  refused(_cellQuestion, reply, "cell information");
-                 return askPlace({});
+                 return askLocation({});
              }
              _follower.faults().over(_cellQuestion.subject);
              const Modem* modem = _follower.modem();
              Dictionaries cells = modem ? cellsOf(reply.value, *modem) : Dictionaries();
              if (hasServingCell(cells))
-                 return endTurn(cells);
-             askPlace(std::move(cells));
+                 return endPoll(cells);
+             askLocation(std::move(cells));
          });
 }
 
-void ModemSession::askPlace(Dictionaries cells) {
+void ModemSession::askLocation(Dictionaries cells) {
     const Modem* modem = _follower.modem();
-    if (_placeQuestion.turns > 0)
-        --_placeQuestion.turns;
+    if (_locationQuestion.turns > 0)
+        --_locationQuestion.turns;
     else if (modem && modem->has(mm::location))
         return call({.path = _path, .interface = mm::location, .method = "GetLocation", .arguments = {}},
                     [this, known = std::move(cells)](const BusReply& reply) mutable {
                         const Modem* followed = _follower.modem();
                         if (reply.failed())
-                            refused(_placeQuestion, reply, "its place in the network");
+                            refused(_locationQuestion, reply, "its place in the network");
                         else
-                            _follower.faults().over(_placeQuestion.subject);
+                            _follower.faults().over(_locationQuestion.subject);
                         if (const DictionaryRef place = followed ? placeOf(reply.value, *followed) : nullptr)
                             known.insert(known.begin(), place);
-                        endTurn(known);
+                        endPoll(known);
                     });
-    endTurn(cells);
+    endPoll(cells);
 }
 
-void ModemSession::endTurn(const Dictionaries& cells) {
+void ModemSession::endPoll(const Dictionaries& cells) {
     after(cellInterval, [this] { turn(); });
     // An empty list is reported once: it clears the display.
-    if (std::exchange(_cellsTold, !cells.empty()) || !cells.empty())
+    if (std::exchange(_hadCells, !cells.empty()) || !cells.empty())
         _reports.cells(cells);
 }
 
 void ModemSession::refused(Question& question, const BusReply& reply, std::string_view what) {
-    tellFault(question.subject, reply, what);
+    reportFault(question.subject, reply, what);
     // Others may be over at the next turn: a modem that is not enabled yet, one that was busy.
     if (reply.isUnsupported() || reply.isDenied())
-        question.turns = turnsAfterRefusal - 1;
+        question.turns = pollsAfterRefusal - 1;
 }
 
-void ModemSession::tellFault(std::string_view subject, const BusReply& reply, std::string_view what) {
+void ModemSession::reportFault(std::string_view subject, const BusReply& reply, std::string_view what) {
     const std::string end = std::string(what) + " (" + reply.reason() + ')';
     FaultLog& faults = _follower.faults();
     if (reply.isUnsupported())
@@ -154,7 +154,7 @@ void ModemSession::setSignalRate() {
              if (!reply.failed())
                  return _follower.faults().over("levels");
              _earlierRate.reset();
-             tellFault("levels", reply, "its levels");
+             reportFault("levels", reply, "its levels");
          });
 }
 
@@ -173,7 +173,7 @@ void ModemSession::modemChanged() {
         // What was refused in the one state may be granted in the next.
         _state = state;
         _cellQuestion.turns = 0;
-        _placeQuestion.turns = 0;
+        _locationQuestion.turns = 0;
         if (!_earlierRate)
             _hadSignal = false;
     }
@@ -219,8 +219,8 @@ void ModemSession::readPart(const std::string& path) {
              part->second.answered = true;
              reportLater();
              if (reply.failed()) {
-                 _partTurns = turnsAfterRefusal;
-                 return tellFault(isSIM ? "SIM" : "bearer", reply, isSIM ? "its SIM" : "a bearer");
+                 _partPolls = pollsAfterRefusal;
+                 return reportFault(isSIM ? "SIM" : "bearer", reply, isSIM ? "its SIM" : "a bearer");
              }
              _follower.faults().over(isSIM ? "SIM" : "bearer");
              const DictionaryRef properties = reply.value.dictionaryRef();
@@ -241,7 +241,7 @@ void ModemSession::objectChanged(const std::string& path, const Array& arguments
 void ModemSession::reportLater() {
     if (std::exchange(_reporting, true))
         return;
-    after(settling, [this] {
+    after(reportDelay, [this] {
         _reporting = false;
         report();
     });
@@ -267,9 +267,9 @@ void ModemSession::reportFiles(const Modem& modem) {
         return;
     const bool read = sim != _parts.end() && sim->second.properties;
     const DictionaryRef files = simFilesOf(modem, read ? *sim->second.properties : unread);
-    if (files->empty() || Value(files) == _toldFiles)
+    if (files->empty() || Value(files) == _reportedFiles)
         return;
-    _toldFiles = files;
+    _reportedFiles = files;
     _reports.simFiles(files);
 }
 
@@ -284,9 +284,9 @@ void ModemSession::reportContexts(const Modem& modem) {
     }
     const Dictionaries contexts = contextsOf(modem, bearers);
     Value now = valueOf(contexts);
-    if (now == _toldContexts)
+    if (now == _reportedContexts)
         return;
-    _toldContexts = std::move(now);
+    _reportedContexts = std::move(now);
     _reports.contexts(contexts);
 }
 

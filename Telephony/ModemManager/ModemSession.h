@@ -36,13 +36,13 @@ public:
     static constexpr std::chrono::seconds cellInterval{3};
     /// A refused query is retried after this many intervals, a minute: permissions may have changed
     /// meanwhile.
-    static constexpr int turnsAfterRefusal = 20;
+    static constexpr int pollsAfterRefusal = 20;
     /// The time-out of a cell query, which is slow on a serial line.
     static constexpr std::chrono::seconds cellTimeout{30};
     /// The rate, in seconds, at which ModemManager is to poll the levels.
     static constexpr std::uint32_t signalRate = 5;
     /// The delay that combines changes in quick succession into one report.
-    static constexpr std::chrono::milliseconds settling{100};
+    static constexpr std::chrono::milliseconds reportDelay{100};
 
     /// Starts querying from the queue, not inside this call. All must outlive it. Precondition: the follower
     /// has a modem.
@@ -69,11 +69,11 @@ private:
     };
 
     void turn();
-    void askCells();
-    void askPlace(Dictionaries cells);
-    void endTurn(const Dictionaries& cells);
+    void requestCells();
+    void askLocation(Dictionaries cells);
+    void endPoll(const Dictionaries& cells);
     void refused(Question& question, const BusReply& reply, std::string_view what);
-    void tellFault(std::string_view subject, const BusReply& reply, std::string_view what);
+    void reportFault(std::string_view subject, const BusReply& reply, std::string_view what);
     void setSignalRate();
     void restoreSignalRate();
 
@@ -94,17 +94,17 @@ private:
     std::string _path; ///< the modem's
     std::string _name; ///< "modem 0", for messages
     Question _cellQuestion{"cells"};
-    Question _placeQuestion{"place"};
-    int _partTurns = 0;                        ///< intervals until unreadable parts are retried
-    bool _cellsTold = false;                   ///< the last answer had cells
+    Question _locationQuestion{"place"};
+    int _partPolls = 0;                        ///< intervals until unreadable parts are retried
+    bool _hadCells = false;                    ///< the last answer had cells
     std::optional<std::uint32_t> _earlierRate; ///< ModemManager's earlier rate; absent while it is unchanged
     bool _hadSignal = false;
     Value _state;                       ///< the modem's when last looked at
     std::string _sim;                   ///< the SIM's path
     std::vector<std::string> _bearers;  ///< the bearers' paths
     std::map<std::string, Part> _parts; ///< by path
-    Value _toldFiles;
-    Value _toldContexts;
+    Value _reportedFiles;
+    Value _reportedContexts;
     bool _reporting = false; ///< a report is on the queue
     std::shared_ptr<bool> _alive = std::make_shared<bool>(true);
 };

@@ -18,9 +18,9 @@ namespace velmora {
 class LogChannel : public std::enable_shared_from_this<LogChannel> {
 public:
     /// The queue length above which the client has no room.
-    static constexpr std::size_t roomyQueue = 2000;
+    static constexpr std::size_t maximumQueued = 2000;
     /// How long a source waits for a client without room.
-    static constexpr std::chrono::seconds patience{1};
+    static constexpr std::chrono::seconds slowClientTimeout{1};
 
     LogChannel(MainQueue& queue, std::shared_ptr<LocalPort> commands,
                std::shared_ptr<RemotePort> application);
@@ -50,8 +50,8 @@ private:
     bool _open = true;
     bool _streaming = false;
     LogFilter _filter;
-    bool _full = false;    ///< it had no room at the last check
-    bool _givenUp = false; ///< it has been full for longer than `patience`
+    bool _full = false;   ///< it had no room at the last check
+    bool _isSlow = false; ///< it has been full for longer than `slowClientTimeout`
     std::uint64_t _fullTimes = 0;
 };
 

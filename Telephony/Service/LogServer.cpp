@@ -41,7 +41,7 @@ LogServer::~LogServer() {
     stop();
 }
 
-Result<Done> LogServer::listen(std::function<void()> whenLost) {
+Result<Done> LogServer::listen(std::function<void()> onPortLost) {
     const std::string name(vox::serverPortName);
     const auto answer = [this](LocalPort&, std::int32_t messageId,
                                const Data& payload) -> std::optional<Data> {
@@ -55,12 +55,12 @@ Result<Done> LogServer::listen(std::function<void()> whenLost) {
     if (created.alreadyExisted)
         return Failure{"the port " + name + " is taken, wanted to be the only telephony service"};
     _serverPort = created.port;
-    _serverPort->setInvalidationCallback([lost = std::move(whenLost)](LocalPort& port) {
+    _serverPort->setInvalidationCallback([lost = std::move(onPortLost)](LocalPort& port) {
         logFormat(LogPriority::Error, "the port %s was closed", port.name().c_str());
         lost();
     });
     _serverPort->attachToMainQueue();
-    _source.whenTechnologyChanges([this] { technologyChanged(); });
+    _source.setTechnologyCallback([this] { technologyChanged(); });
     return Done{};
 }
 
@@ -68,12 +68,12 @@ void LogServer::stop() {
     if (const auto port = std::exchange(_serverPort, nullptr)) {
         port->setInvalidationCallback(nullptr);
         port->invalidate();
-        _source.whenTechnologyChanges(nullptr);
+        _source.setTechnologyCallback(nullptr);
     }
     for (const ChannelRef& channel : _channels)
         if (channel->isOpen())
             channel->close();
-    sweep();
+    removeClosedChannels();
 }
 
 Value LogServer::createChannel(const Data& request) {
@@ -88,7 +88,7 @@ Value LogServer::createChannel(const Data& request) {
         logLine(LogPriority::Error, "a request names no port, wanted {\"CreateLogChannel\": NAME}");
         return refusal(Refusal::Malformed);
     }
-    sweep();
+    removeClosedChannels();
     if (_channels.size() >= maximumChannels) {
         logFormat(LogPriority::Error, "%s wants a log channel, but %zu are open already", name->c_str(),
                   _channels.size());
@@ -156,11 +156,11 @@ void LogServer::close(LogChannel& channel, const std::string& why) {
     // Deferred: messages may just now be on their way to the channels.
     _queue.async([this, weak = std::weak_ptr<bool>(_alive)] {
         if (!weak.expired())
-            sweep();
+            removeClosedChannels();
     });
 }
 
-void LogServer::sweep() {
+void LogServer::removeClosedChannels() {
     std::erase_if(_channels, [](const ChannelRef& channel) { return !channel->isOpen(); });
     const bool streaming = std::any_of(_channels.begin(), _channels.end(),
                                        [](const ChannelRef& channel) { return channel->isStreaming(); });
@@ -214,7 +214,7 @@ void LogServer::startStreaming(LogChannel& channel, const Dictionary& command) {
         return;
     }
     // Whoever has gone must not keep a run of the source alive that a new client would then join half-way.
-    sweep();
+    removeClosedChannels();
     channel.stream(*std::move(filter));
     logFormat(LogPriority::Notice, "%s: streaming to %s", channel.name().c_str(),
               channel.applicationName().c_str());
@@ -228,17 +228,17 @@ void LogServer::startStreaming(LogChannel& channel, const Dictionary& command) {
 }
 
 void LogServer::take(const Data& message) {
-    remember(message);
+    cacheExtra(message);
     // A channel may close on the way; none is added or removed.
     for (const ChannelRef& channel : _channels)
         channel->send(message);
 }
 
-void LogServer::remember(const Data& message) {
+void LogServer::cacheExtra(const Data& message) {
     const auto header = LogMessage::parse(message.bytes());
     if (!header || header->type != LogMessage::extraType)
         return;
-    if (_latestExtra.size() < maximumRemembered || _latestExtra.contains(header->code))
+    if (_latestExtra.size() < maximumCachedExtra || _latestExtra.contains(header->code))
         _latestExtra.insert_or_assign(header->code, message);
 }
 

@@ -40,7 +40,7 @@ public:
     static constexpr std::size_t maximumChannels = 64;
 
     /// How many codes of the extra stream are cached; an unusual recording may have many.
-    static constexpr std::size_t maximumRemembered = 16;
+    static constexpr std::size_t maximumCachedExtra = 16;
 
     /// All three must outlive the server.
     LogServer(MessagePorts& ports, MainQueue& queue, LogSource& source);
@@ -48,9 +48,9 @@ public:
     LogServer(const LogServer&) = delete;
     LogServer& operator=(const LogServer&) = delete;
 
-    /// Takes the service's name and serves from now on. `whenLost` is called when the platform closes the
+    /// Takes the service's name and serves from now on. `onPortLost` is called when the platform closes the
     /// server port. Fails when another service has the name or no port can be made.
-    Result<Done> listen(std::function<void()> whenLost);
+    Result<Done> listen(std::function<void()> onPortLost);
     /// Closes all ports and stops the source. Does nothing when not listening.
     void stop();
 
@@ -68,10 +68,10 @@ private:
     void close(LogChannel& channel, const std::string& why);
     void technologyChanged();
     /// Removes closed channels from `_channels` and stops the source after the last.
-    void sweep();
+    void removeClosedChannels();
     [[nodiscard]] std::optional<Data> command(const std::string& channelName, const Data& payload);
     void startStreaming(LogChannel& channel, const Dictionary& command);
-    void remember(const Data& message);
+    void cacheExtra(const Data& message);
 
     MessagePorts& _ports;
     MainQueue& _queue;

@@ -32,7 +32,7 @@ public:
     /// removes it. Later messages are of the new technology. A source whose technology never changes need not
     /// override it.
     // NOLINTNEXTLINE(performance-unnecessary-value-param) those that override it keep the function
-    virtual void whenTechnologyChanges(std::function<void()> /*changed*/) {}
+    virtual void setTechnologyCallback(std::function<void()> /*changed*/) {}
     /// Starts sending from the first message, never inside this call. Precondition: not started. The sink
     /// must live until `stop`.
     virtual void start(LogSink& sink) = 0;

@@ -46,8 +46,8 @@ private:
 
     bool rewind();
     [[nodiscard]] std::optional<ScenarioEvent> next();
-    void tellLosses();
-    void tellEnd();
+    void reportLosses();
+    void reportEnd();
 
     std::string _name;
     std::string _technology;
@@ -58,8 +58,8 @@ private:
     std::optional<Time> _lastTime;          ///< of the previous message, in this round
     std::chrono::nanoseconds _offset{0};    ///< of the previous message
     std::uint64_t _played = 0;              ///< messages of this round
-    std::size_t _lossesTold = 0;
-    bool _totalTold = false;
+    std::size_t _lossesReported = 0;
+    bool _totalReported = false;
 };
 
 } // namespace velmora

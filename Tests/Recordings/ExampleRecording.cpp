@@ -98,7 +98,7 @@ void ExampleRecording::eachMessage(const std::function<void(Time, const Data&)>&
         using Seconds = std::chrono::duration<double>;
         for (; Seconds(event.offset) < Seconds(excerpt.to_s); event = drive->next())
             if (Seconds(event.offset) >= Seconds(excerpt.from_s))
-                take(DriveScenario::beginning() + event.offset + arrivalDelay, event.message);
+                take(DriveScenario::startTime() + event.offset + arrivalDelay, event.message);
     }
 }
 

@@ -56,7 +56,7 @@ Result<Done> make(Scenario& scenario, const Length& length, const std::string& p
         const ScenarioEvent event = scenario.next();
         if (event.offset >= length.time)
             break;
-        const Time time = DriveScenario::beginning() + event.offset;
+        const Time time = DriveScenario::startTime() + event.offset;
         if (Result<Done> written = (*writer)->append(time, event.message.bytes()); !written)
             return written;
     }

@@ -146,7 +146,7 @@ TEST_F(LogServerClientsTest, rememberedStatesAreBounded) {
     source.sink->take(record(3, "07", 0xFF));
     stream(createChannel("two"));
     const auto states = sentTo("two");
-    ASSERT_EQ(states.size(), LogServer::maximumRemembered);
+    ASSERT_EQ(states.size(), LogServer::maximumCachedExtra);
     EXPECT_EQ(states[3], record(3, "07", 0xFF));
 }
 
@@ -259,7 +259,7 @@ TEST(LogServerRoomTest, waitsForASlowClientButNotForAStuckOne) {
     ports.port->waiting = 1'000'000;
     EXPECT_FALSE(source.sink->hasRoom());
     queue.advance(900ms);
-    EXPECT_FALSE(source.sink->hasRoom()) << "patience began anew";
+    EXPECT_FALSE(source.sink->hasRoom()) << "slowClientTimeout began anew";
     queue.advance(200ms);
     EXPECT_TRUE(source.sink->hasRoom()) << "it is stuck";
     ports.port->waiting = 10;

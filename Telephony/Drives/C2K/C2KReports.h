@@ -4,8 +4,8 @@
 #pragma once
 
 #include "Telephony/Drives/C2K/C2KRecords.h"
-#include "Telephony/Drives/DamagedRecords.h"
 #include "Telephony/Drives/PeriodicReport.h"
+#include "Telephony/Drives/UnusualMessages.h"
 
 #include <cstdint>
 #include <optional>
@@ -55,6 +55,6 @@ using C2KReport = PeriodicReport<C2KReportContext>;
 [[nodiscard]] std::optional<RecordBuilder> systemReport(C2KReportContext& context);
 
 /// The parts of unusual messages; `turn` selects which record is too short and which is inconsistent.
-[[nodiscard]] DamageMaterial c2kDamageMaterial(C2KReportContext& context, std::size_t turn);
+[[nodiscard]] UnusualMessageParts c2kUnusualMessageParts(C2KReportContext& context, std::size_t turn);
 
 } // namespace velmora

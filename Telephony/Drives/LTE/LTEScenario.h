@@ -29,8 +29,9 @@ namespace velmora {
 ///
 /// From six to eight messages come a second. The extra stream reports the SIM, the cells around and the
 /// contexts, as binary and XML property lists in turn. About every ten seconds a message is unusual (see
-/// Damage): the records of serving cell, idle and connected measurement, neighbours and candidates are too
-/// short in rotation, and each of the three counted ones has a count that is too high. Main thread only.
+/// UnusualMessage): the records of serving cell, idle and connected measurement, neighbours and candidates
+/// are too short in rotation, and each of the three counted ones has a count that is too high. Main thread
+/// only.
 class LTEScenario final : public DriveScenario {
 public:
     explicit LTEScenario(std::uint64_t seed);
@@ -54,12 +55,12 @@ private:
     void drive(double seconds) override;
     void react() override;
     void addReports(DriveScript& due) override;
-    [[nodiscard]] DamageMaterial damageMaterial(std::size_t number) override;
+    [[nodiscard]] UnusualMessageParts unusualMessageParts(std::size_t number) override;
 
     /// Camps on the best cell of the phone's carrier, where there is one, and reports it.
     std::optional<RecordBuilder> camp();
-    void sayConnected(double delay, bool connected);
-    void sayContexts(double delay, int count);
+    void addConnectedStep(double delay, bool connected);
+    void addContextsStep(double delay, int count);
 
     LTENetwork _network;
     LTEPhone _phone;

@@ -24,10 +24,10 @@ namespace velmora {
 /// - A packet session with two contexts; then power-off with every list empty, and again from the start.
 ///
 /// About ten messages come a second. The extra stream reports the SIM, the cells around and the contexts, as
-/// binary and XML property lists in turn. About every ten seconds a message is unusual (see Damage): the
-/// records of the RRC state and of the serving cell come too short alternately - after the former the state
-/// is unknown until the next report - and each of the three counted records comes with a count too high. Main
-/// thread only.
+/// binary and XML property lists in turn. About every ten seconds a message is unusual (see UnusualMessage):
+/// the records of the RRC state and of the serving cell come too short alternately - after the former the
+/// state is unknown until the next report - and each of the three counted records comes with a count too
+/// high. Main thread only.
 class UTRANScenario final : public DriveScenario {
 public:
     explicit UTRANScenario(std::uint64_t seed);
@@ -48,10 +48,10 @@ private:
     void drive(double seconds) override;
     void react() override;
     void addReports(DriveScript& due) override;
-    [[nodiscard]] DamageMaterial damageMaterial(std::size_t number) override;
+    [[nodiscard]] UnusualMessageParts unusualMessageParts(std::size_t number) override;
 
-    void sayRRC(double delay, records::RRCState state);
-    void sayContexts(double delay, int count);
+    void addRRCStep(double delay, records::RRCState state);
+    void addContextsStep(double delay, int count);
 
     UTRANNetwork _network;
     UTRANPhone _phone;

@@ -123,7 +123,7 @@ TEST(LTEScenarioTest, recordsAreAsTheirTablesSayButForTheOddOnes) {
 }
 
 TEST(LTEScenarioTest, everyKindOfOddMessageComes) {
-    const OddMessages odd = oddMessagesOf(twentyMinutes(), isGood, codes);
+    const OddMessages odd = unusualMessagesOf(twentyMinutes(), isGood, codes);
     for (const int count : {odd.tooShort, odd.wrongType, odd.prefixed, odd.unknownCode})
         EXPECT_GE(count, 3);
 }

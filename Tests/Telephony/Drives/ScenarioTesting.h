@@ -81,8 +81,8 @@ struct OddMessages {
     int unknownCode = 0;
 };
 /// Expects the prefixed ones to be good records.
-[[nodiscard]] OddMessages oddMessagesOf(const Drive& drive, const RecordCheck& good,
-                                        const std::set<std::uint32_t>& codes);
+[[nodiscard]] OddMessages unusualMessagesOf(const Drive& drive, const RecordCheck& good,
+                                            const std::set<std::uint32_t>& codes);
 
 /// Expects the same offsets and bytes.
 void expectSame(const Drive& again, const Drive& first);

@@ -95,7 +95,7 @@ TEST(UTRANScenarioTest, recordsAreAsTheirTablesSayButForTheOddOnes) {
 }
 
 TEST(UTRANScenarioTest, everyKindOfOddMessageComes) {
-    const OddMessages odd = oddMessagesOf(tenMinutes(), meets(requirements), codes);
+    const OddMessages odd = unusualMessagesOf(tenMinutes(), meets(requirements), codes);
     for (const int count : {odd.tooShort, odd.wrongType, odd.prefixed, odd.unknownCode})
         EXPECT_GE(count, 3);
 }

@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Telephony/Drives/DamagedRecords.h"
+#include "Telephony/Drives/UnusualMessages.h"
 
 #include "LogMessages/LogMessage.h"
 
@@ -16,29 +16,29 @@ std::vector<std::uint8_t> bytesOf(const Data& message) {
 
 } // namespace
 
-std::optional<Data> damagedMessage(Damage damage, const DamageMaterial& material, Time moment) {
+std::optional<Data> unusualMessage(UnusualMessage damage, const UnusualMessageParts& material, Time moment) {
     switch (damage) {
-    case Damage::CutShort: {
+    case UnusualMessage::Truncated: {
         std::vector<std::uint8_t> bytes = bytesOf(material.good.message(moment));
         bytes.resize(5);
         return Data(std::move(bytes));
     }
-    case Damage::WrongType: {
+    case UnusualMessage::WrongType: {
         std::vector<std::uint8_t> bytes = bytesOf(material.good.message(moment));
         bytes[0] = 2;
         return Data(std::move(bytes));
     }
-    case Damage::BelowMinimum: return material.belowMinimum.message(moment);
-    case Damage::Prefixed: {
+    case UnusualMessage::BelowMinimum: return material.belowMinimum.message(moment);
+    case UnusualMessage::Prefixed: {
         std::vector<std::uint8_t> bytes = bytesOf(material.good.message(moment));
         bytes.insert(bytes.begin(), {LogMessage::prefixMarker, 0});
         return Data(std::move(bytes));
     }
-    case Damage::CountOverrun:
+    case UnusualMessage::CountOverrun:
         if (!material.overrun)
             return std::nullopt;
         return material.overrun->message(moment);
-    case Damage::UnknownCode:
+    case UnusualMessage::UnknownCode:
         return RecordBuilder(0x1375, 24).u32(LogMessage::headerLength, material.noise).message(moment);
     }
     return std::nullopt;

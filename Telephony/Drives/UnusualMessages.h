@@ -13,19 +13,20 @@
 namespace velmora {
 
 /// What is odd about a message now and then. Decoders have to cope with all of it.
-enum class Damage : std::uint8_t {
-    CutShort,     ///< five bytes of a record: too short to be decoded
+enum class UnusualMessage : std::uint8_t {
+    Truncated,    ///< five bytes of a record: too short to be decoded
     WrongType,    ///< a type byte of 2
     BelowMinimum, ///< a well-framed record that is shorter than its section's least length
     Prefixed,     ///< a prefix before a good record: odd, but nothing is wrong with it
     CountOverrun, ///< a count that exceeds the record's entries
     UnknownCode,  ///< a good record of a code that no decoder wants
 };
-inline constexpr std::array everyDamage = {Damage::CutShort, Damage::WrongType,    Damage::BelowMinimum,
-                                           Damage::Prefixed, Damage::CountOverrun, Damage::UnknownCode};
+inline constexpr std::array allUnusualMessages = {UnusualMessage::Truncated,    UnusualMessage::WrongType,
+                                                  UnusualMessage::BelowMinimum, UnusualMessage::Prefixed,
+                                                  UnusualMessage::CountOverrun, UnusualMessage::UnknownCode};
 
 /// A technology's parts of unusual messages.
-struct DamageMaterial {
+struct UnusualMessageParts {
     RecordBuilder good;                   ///< for unusual framing
     RecordBuilder belowMinimum;           ///< already shorter than its section's least length
     std::optional<RecordBuilder> overrun; ///< already with fewer entries than its count
@@ -34,6 +35,7 @@ struct DamageMaterial {
 
 /// A message of that kind; none where the technology has no parts for it. Records of the extra stream are
 /// never changed: an unreadable SIM file ends the application.
-[[nodiscard]] std::optional<Data> damagedMessage(Damage damage, const DamageMaterial& material, Time moment);
+[[nodiscard]] std::optional<Data> unusualMessage(UnusualMessage damage, const UnusualMessageParts& material,
+                                                 Time moment);
 
 } // namespace velmora
