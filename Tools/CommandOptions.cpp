@@ -19,7 +19,7 @@ CLI::Validator wants(std::function<bool(const std::string&)> isGood, const std::
         "");
 }
 
-CLI::Validator wantsOneOf(const std::vector<std::string>& words) {
+CLI::Validator oneOf(const std::vector<std::string>& words) {
     std::string wanted;
     for (const std::string& word : words)
         wanted += (wanted.empty() ? "" : " or ") + word;
@@ -30,7 +30,7 @@ CLI::Validator wantsOneOf(const std::vector<std::string>& words) {
         wanted);
 }
 
-CLI::Validator wantsCount() {
+CLI::Validator positiveCount() {
     return wants(
         [](const std::string& text) {
             std::uint64_t count = 0;

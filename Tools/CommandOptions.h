@@ -16,9 +16,9 @@ namespace velmora {
 
 /// `wanted` describes the texts for which `isGood` holds.
 [[nodiscard]] CLI::Validator wants(std::function<bool(const std::string&)> isGood, const std::string& wanted);
-[[nodiscard]] CLI::Validator wantsOneOf(const std::vector<std::string>& words);
+[[nodiscard]] CLI::Validator oneOf(const std::vector<std::string>& words);
 /// A whole number above 0.
-[[nodiscard]] CLI::Validator wantsCount();
+[[nodiscard]] CLI::Validator positiveCount();
 
 /// `--technology`, with a description that begins with `purpose`.
 void addTechnology(CLI::App& command, std::string& technology, const std::string& purpose);

@@ -150,7 +150,7 @@ TEST(CommandLineTest, UsageErrorsSayWhatWasGivenAndWhatIsWanted) {
     };
     for (const Case& row : cases) {
         const CommandLine line = parse(row.arguments);
-        const auto* words = std::get_if<CommandLine::Words>(&line.command);
+        const auto* words = std::get_if<CommandLine::Notice>(&line.command);
         ASSERT_NE(words, nullptr) << row.message;
         EXPECT_EQ(words->status, 2);
         EXPECT_EQ(words->text,

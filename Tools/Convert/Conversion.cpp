@@ -92,7 +92,7 @@ Result<bool> toDLFLog(MessageReader& reader, const Conversion& conversion, int d
         if ((*writer)->hasFailed())
             return Failure{appended.reason()};
         if (!appended && (*writer)->refused() <= MessageReader::maximumLosses)
-            report(placeInFile(conversion.title, messages->next->number, messages->next->offset) +
+            report(positionInFile(conversion.title, messages->next->number, messages->next->offset) +
                    ": left out: " + appended.reason());
     }
     if (const std::uint64_t refused = (*writer)->refused(); refused > MessageReader::maximumLosses)

@@ -30,7 +30,7 @@ constexpr mode_t newFileMode = 0666;
 /// The name of the file that a signal which ends the program has to remove; a signal handler needs it global.
 char nameToRemove[PATH_MAX];
 
-void removeAndEnd(int number) {
+void removeAndExit(int number) {
     ::unlink(nameToRemove);
     ::signal(number, SIG_DFL);
     ::raise(number);
@@ -43,7 +43,7 @@ public:
         if (name.size() >= sizeof nameToRemove)
             return;
         *std::copy(name.begin(), name.end(), nameToRemove) = '\0';
-        handle(removeAndEnd);
+        handle(removeAndExit);
     }
     ~RemovedWhenInterrupted() { handle(SIG_DFL); }
     RemovedWhenInterrupted(const RemovedWhenInterrupted&) = delete;
@@ -74,7 +74,7 @@ std::string whyRefused(const ConvertOptions& options) {
         return options.out + " is the input, wanted another file";
     if (!S_ISREG(out.st_mode))
         return options.out + " is no regular file";
-    return options.force ? std::string() : alreadyThere(options.out);
+    return options.force ? std::string() : fileExistsMessage(options.out);
 }
 
 /// How many refreshes the file takes; none where it is no regular file, which can be read but once.

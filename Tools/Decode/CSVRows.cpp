@@ -17,7 +17,7 @@ CSVRows::CSVRows(Output& output, bool isLive, const DecodeOptions& options, cons
     _fileCell = cell.view();
 }
 
-void CSVRows::messageDecoded(const LoggedMessage& message, LogGenerator& decoder, Dictionary& state) {
+void CSVRows::didDecode(const LoggedMessage& message, LogGenerator& decoder, Dictionary& state) {
     if (_options.every == DecodeOptions::Every::Message)
         writeRow(message.time, decoder.display(state));
 }

@@ -9,7 +9,7 @@
 #include "Tools/Decode/DecodeWriter.h"
 #include "Tools/Decode/Jobs/JobScheduler.h"
 #include "Tools/ExitStatus.h"
-#include "Tools/LogSubstitute.h"
+#include "Tools/LogOverride.h"
 #include "Tools/Output.h"
 #include "Tools/Report.h"
 #include "Tools/Text/PrintableText.h"

@@ -62,7 +62,7 @@ CLI::App* addDecode(CLI::App& app, DecodeOptions& options) {
             "text, unless told otherwise: the display tree in the end; json: an object in the end, with the "
             "technology, the number of messages, and the display; jsonl: such an object with its time on a "
             "line of its own for each refresh; csv: a row for each refresh, a column for each --select")
-        ->check(wantsOneOf({"text", "json", "jsonl", "csv"}))
+        ->check(oneOf({"text", "json", "jsonl", "csv"}))
         ->type_name("text|json|jsonl|csv");
     command
         ->add_option_function<std::string>(
@@ -73,7 +73,7 @@ CLI::App* addDecode(CLI::App& app, DecodeOptions& options) {
             },
             "message: jsonl has an object for each message, with its code and what it concerned, and csv a "
             "row; refresh, unless told otherwise")
-        ->check(wantsOneOf({"refresh", "message"}))
+        ->check(oneOf({"refresh", "message"}))
         ->type_name("refresh|message");
     command
         ->add_option_function<std::vector<std::string>>(
@@ -90,7 +90,7 @@ CLI::App* addDecode(CLI::App& app, DecodeOptions& options) {
     addBound(*command, "--to", options.range.to, "Only messages before this time");
     addTechnology(*command, options.technology, "Decode as");
     command->add_option("--jobs", options.jobs, "Decode this many files side by side")
-        ->check(wantsCount())
+        ->check(positiveCount())
         ->type_name("N");
     command->footer(
         "With several files, text is headed by the files' names, json is one object a file, one behind\n"

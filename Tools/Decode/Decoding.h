@@ -34,7 +34,7 @@ public:
     virtual ~DecodingObserver() = default;
 
     /// Called before a message in the range is decoded.
-    virtual void messageComes(const LoggedMessage&) {}
+    virtual void willDecode(const LoggedMessage&) {}
     /// What gets the effects of each message; asked once. Null for none, which makes decoding faster.
     [[nodiscard]] virtual MessageEffects* effects() { return nullptr; }
     /// Whether the decoder keeps its history, for what a snapshot saves; asked at the beginning and after
@@ -44,13 +44,13 @@ public:
     /// is faster, since text is made only of what is asked for.
     [[nodiscard]] virtual bool wantsEveryRefresh() const { return true; }
     /// A wanted message has been decoded; `decoder.display(state)` is the display as it then stands.
-    virtual void messageDecoded(const LoggedMessage&, LogGenerator& /*decoder*/, Dictionary& /*state*/) {}
+    virtual void didDecode(const LoggedMessage&, LogGenerator& /*decoder*/, Dictionary& /*state*/) {}
     /// Called after a refresh; `decoded` holds the display and the result so far.
     virtual void refreshed(Time /*tick*/, const Decoded& /*decoded*/) {}
     /// Called after the last refresh, with the final state.
     virtual void ended(const LogGenerator& /*decoder*/, const Dictionary& /*state*/) {}
     /// Whether decoding may stop here; asked after every message.
-    [[nodiscard]] virtual bool hasEnough() const { return false; }
+    [[nodiscard]] virtual bool isDone() const { return false; }
 };
 
 struct DecodingRequest {

@@ -54,7 +54,7 @@ void RefreshLines::refreshed(Time tick, const Decoded& decoded) {
 MessageLines::MessageLines(Output& output, bool isLive, const std::string& file)
     : LineWriter(output, isLive), _begin(beginOf(file)) {}
 
-void MessageLines::messageDecoded(const LoggedMessage&, LogGenerator&, Dictionary&) {
+void MessageLines::didDecode(const LoggedMessage&, LogGenerator&, Dictionary&) {
     endLine(_end);
 }
 

@@ -10,7 +10,7 @@ namespace velmora {
 namespace {
 
 /// At most what the event loop's timers hold, which is 24 days.
-CLI::Validator wantsSeconds() {
+CLI::Validator validSeconds() {
     return wants(
         [](const std::string& text) {
             double seconds = 0;
@@ -28,10 +28,10 @@ CLI::App* addRecord(CLI::App& app, RecordOptions& options) {
     command->add_flag("--force", options.force, "Overwrite FILE where there is one");
     command
         ->add_option("--duration", options.duration_seconds, "Stop after this time, counted from the start")
-        ->check(wantsSeconds())
+        ->check(validSeconds())
         ->type_name("SECONDS");
     command->add_option("--count", options.count, "Stop after this many messages")
-        ->check(wantsCount())
+        ->check(positiveCount())
         ->type_name("N");
     command->footer(
         "What arrives is on its way to the disk within half a second. When FILE cannot be written or the\n"

@@ -70,7 +70,7 @@ bool Recorder::learn(std::string_view technology, bool hasDecoder) {
     // It may have gone and come back between two checks.
     if (std::exchange(_streaming, false))
         serviceIsGone();
-    if (!check(_session.learnTechnology(technology)))
+    if (!check(_session.setTechnology(technology)))
         return false;
     if (std::exchange(_gone, false))
         _news.tell(std::string(serviceTitle) + " is back");
@@ -120,7 +120,7 @@ void Recorder::serviceIsGone() {
 /// Ends the recording on a failure, after reporting it. Returns whether there was none.
 bool Recorder::check(const Result<Done>& result) {
     if (result) {
-        _news.tellTrouble();
+        _news.reportWriteError();
         return true;
     }
     if (_session.hasLostReader()) {

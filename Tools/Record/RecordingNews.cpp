@@ -34,21 +34,21 @@ void RecordingNews::tell(const std::string& text) {
     logLine(LogPriority::Error, text);
 }
 
-void RecordingNews::tellTrouble() {
+void RecordingNews::reportWriteError() {
     const bool trouble = !_session.trouble().empty();
-    if (trouble && !_toldTrouble)
+    if (trouble && !_reportedError)
         tell(_session.trouble() + "; recording goes on when it can be, until then up to " + queueSize() +
              " of messages wait");
-    if (_session.isDropping() && !_toldDropping)
+    if (_session.isDropping() && !_reportedDropping)
         tell(queueSize() + " of messages wait for " + _file + "; further ones are dropped");
-    if (!trouble && _toldTrouble) {
+    if (!trouble && _reportedError) {
         const std::uint64_t dropped = _session.dropped() - _droppedBefore;
         tell(_file + " can be written again; " + (dropped == 0 ? "no" : std::to_string(dropped)) +
              " messages were dropped");
         _droppedBefore = _session.dropped();
     }
-    _toldTrouble = trouble;
-    _toldDropping = _session.isDropping();
+    _reportedError = trouble;
+    _reportedDropping = _session.isDropping();
 }
 
 void RecordingNews::showProgress(Time now, bool isConnected) {

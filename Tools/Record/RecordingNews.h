@@ -3,7 +3,7 @@
 
 #pragma once
 
-#include "Tools/LogSubstitute.h"
+#include "Tools/LogOverride.h"
 #include "Tools/Record/RecordingSession.h"
 
 #include <cstdint>
@@ -23,7 +23,7 @@ public:
     void tell(const std::string& text);
     /// Tells each change once: trouble that has come up, messages for which there is no room, trouble that
     /// has passed.
-    void tellTrouble();
+    void reportWriteError();
 
     void showProgress(Time now, bool isConnected);
     void endProgress() { _progress.reset(); }
@@ -33,8 +33,8 @@ private:
     std::string _file;
     Time _started;
     std::unique_ptr<ProgressLine> _progress;
-    bool _toldTrouble = false;
-    bool _toldDropping = false;
+    bool _reportedError = false;
+    bool _reportedDropping = false;
     std::uint64_t _droppedBefore = 0; ///< in all earlier trouble
 };
 

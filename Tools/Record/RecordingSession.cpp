@@ -45,7 +45,7 @@ Result<std::unique_ptr<RecordingSession>> RecordingSession::open(const std::stri
     if (!session->_created && errno == EEXIST) {
         session->_file = FileDescriptor(::open(path.c_str(), O_WRONLY | O_CLOEXEC));
         if (session->_file.get() >= 0 && isRegularFile(session->_file.get()) && !force)
-            return Failure{alreadyThere(path)};
+            return Failure{fileExistsMessage(path)};
     }
     if (session->_file.get() < 0)
         return Failure{"cannot create " + path + ": " + std::generic_category().message(errno)};
@@ -63,7 +63,7 @@ void RecordingSession::removeIfEmpty() const {
         ::unlink(_path.c_str());
 }
 
-Result<Done> RecordingSession::learnTechnology(std::string_view technology) {
+Result<Done> RecordingSession::setTechnology(std::string_view technology) {
     const std::string_view name = shortTechnologyName(technology);
     if (_writer && name != _technology)
         return Failure{"the telephony service now speaks " + std::string(name) + ", the recording is of " +
@@ -100,7 +100,7 @@ Result<Done> RecordingSession::learnTechnology(std::string_view technology) {
     }
     _writer = *std::move(writer);
     _technology = name;
-    return unlessItMayPass(_writer->flush()); // the head may be waiting
+    return keepTemporaryError(_writer->flush()); // the head may be waiting
 }
 
 Result<Done> RecordingSession::append(Time time, Bytes message) {
@@ -108,21 +108,21 @@ Result<Done> RecordingSession::append(Time time, Bytes message) {
     Result<Done> appended = _writer->append(time, message);
     if (_writer->messages() != before)
         _bytes += message.size();
-    return unlessItMayPass(std::move(appended));
+    return keepTemporaryError(std::move(appended));
 }
 
 Result<Done> RecordingSession::save() {
     if (!_writer)
         return Done{};
-    return unlessItMayPass(_writer->sync());
+    return keepTemporaryError(_writer->sync());
 }
 
-Result<Done> RecordingSession::unlessItMayPass(Result<Done> result) {
+Result<Done> RecordingSession::keepTemporaryError(Result<Done> result) {
     const bool waiting = _writer->hasTemporaryError();
     if (!waiting)
-        _trouble.clear();
+        _temporaryError.clear();
     else if (!result)
-        _trouble = result.reason();
+        _temporaryError = result.reason();
     return waiting ? Result<Done>(Done{}) : std::move(result);
 }
 

@@ -31,7 +31,7 @@ public:
 
     /// To be called when the service has named the technology. The first call starts the recording; another
     /// technology after that is a failure.
-    Result<Done> learnTechnology(std::string_view technology);
+    Result<Done> setTechnology(std::string_view technology);
     /// A message has arrived. A failure ends the recording; an error that may pass is none (see `trouble`).
     /// Precondition: the technology is known.
     Result<Done> append(Time time, Bytes message);
@@ -54,7 +54,7 @@ public:
     /// Messages dropped while the file could not be written.
     [[nodiscard]] std::uint64_t dropped() const { return _writer ? _writer->droppedMessages() : 0; }
     /// The temporary error; empty when there is none. Messages are queued meanwhile.
-    [[nodiscard]] const std::string& trouble() const { return _trouble; }
+    [[nodiscard]] const std::string& trouble() const { return _temporaryError; }
     /// Whether the queue is full.
     [[nodiscard]] bool isDropping() const { return _writer && _writer->isDropping(); }
     /// Whether the recording goes to a pipe whose reader has closed it.
@@ -67,14 +67,14 @@ private:
     explicit RecordingSession(std::string path) : _path(std::move(path)) {}
 
     /// Turns an error that may pass into success, and keeps it as the trouble.
-    [[nodiscard]] Result<Done> unlessItMayPass(Result<Done> result);
+    [[nodiscard]] Result<Done> keepTemporaryError(Result<Done> result);
 
     std::string _path;
     FileDescriptor _file;  ///< until the writer has it
     bool _created = false; ///< this created the file
     std::unique_ptr<PcapngWriter> _writer;
     std::string _technology;
-    std::string _trouble;
+    std::string _temporaryError;
     std::uint64_t _bytes = 0;
 };
 

@@ -41,8 +41,8 @@ public:
 
 private:
     void watchSignals();
-    void takeInput();
-    void takeSignal();
+    void handleInput();
+    void handleSignal();
 
     Events _events;
     bool _active = true;

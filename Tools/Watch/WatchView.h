@@ -3,7 +3,7 @@
 
 #pragma once
 
-#include "Tools/LogSubstitute.h"
+#include "Tools/LogOverride.h"
 #include "Tools/Output.h"
 #include "Tools/Text/TreeText.h"
 #include "Tools/Watch/Terminal.h"
@@ -54,12 +54,12 @@ public:
     void leave() override;
 
 private:
-    void takeInput(std::string_view bytes);
+    void handleInput(std::string_view bytes);
     void draw();
 
     std::function<void()> _quit;
-    std::unique_ptr<HeldLog>
-        _heldLog; ///< declared before the terminal: its lines come after the screen is restored
+    std::unique_ptr<DeferredLog>
+        _deferredLog; ///< declared before the terminal: its lines come after the screen is restored
     Terminal _terminal;
     KeyReader _keys;
     std::string _status;

@@ -10,13 +10,13 @@ namespace velmora {
 namespace {
 
 /// In bytes; the size that the library begins with, which setting it keeps it from changing.
-constexpr int smallestLargePiece = 128 * 1024;
+constexpr int smallestLargeAllocation = 128 * 1024;
 
 } // namespace
 
 void returnLargeAllocations() {
 #ifdef M_MMAP_THRESHOLD // not every C library keeps any
-    ::mallopt(M_MMAP_THRESHOLD, smallestLargePiece);
+    ::mallopt(M_MMAP_THRESHOLD, smallestLargeAllocation);
 #endif
 }
 

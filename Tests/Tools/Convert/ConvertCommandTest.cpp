@@ -38,7 +38,7 @@ protected:
         ToolProcess process(setup);
         EXPECT_EQ(process.exitStatus(), status) << process.errors();
         EXPECT_EQ(process.output(), "");
-        return ownWords(process.errors());
+        return ownMessages(process.errors());
     }
     /// What is in the directory that the tests write to.
     [[nodiscard]] std::vector<std::string> outputs() const {
@@ -174,7 +174,7 @@ TEST_F(ConvertCommandTest, InputIsNeverTheOutput) {
                             VELMORA_BUILD_DIR "/velmora-log", path("drive.pcapng")}),
                       "/bin/sh");
     EXPECT_EQ(piped.exitStatus(), 1);
-    EXPECT_EQ(ownWords(piped.errors()),
+    EXPECT_EQ(ownMessages(piped.errors()),
               "velmora-log: " + path("drive.pcapng") + " is the input, wanted another file\n");
     EXPECT_EQ(contentOf("drive.pcapng"), before);
 }
@@ -265,7 +265,7 @@ TEST_F(ConvertCommandTest, FailureToWriteLeavesWhatWasThere) {
                                   (VELMORA_BUILD_DIR "/velmora-log"), path("drive.pcapng"), out}),
                             "/bin/sh");
         EXPECT_EQ(process.exitStatus(), 1);
-        EXPECT_EQ(ownWords(process.errors()),
+        EXPECT_EQ(ownMessages(process.errors()),
                   form == ".velmora" ? "velmora-log: " + out + ": cannot be written: File too large\n"
                                      : "velmora-log: cannot write " + out + ": File too large\n");
     }

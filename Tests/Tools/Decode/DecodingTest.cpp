@@ -68,12 +68,12 @@ protected:
     };
 
     struct Observer final : DecodingObserver {
-        void messageDecoded(const LoggedMessage&, LogGenerator&, Dictionary&) override { ++messages; }
+        void didDecode(const LoggedMessage&, LogGenerator&, Dictionary&) override { ++messages; }
         void refreshed(Time tick, const Decoded& decoded) override {
             const Dictionary* section = (*decoded.display.asDictionary())["GSM RR Info"].asDictionary();
             refreshes.push_back({tick, *(*section)["RR State"].asString()});
         }
-        [[nodiscard]] bool hasEnough() const override { return messages >= mostMessages; }
+        [[nodiscard]] bool isDone() const override { return messages >= mostMessages; }
 
         std::uint64_t mostMessages = std::numeric_limits<std::uint64_t>::max();
         std::uint64_t messages = 0;
@@ -229,8 +229,8 @@ TEST_F(DecodingTest, TechnologyIsShownInShort) {
 }
 
 TEST(PlaceInFileTest, NamesTheRecordWhereThereIsOne) {
-    EXPECT_EQ(placeInFile("drive.pcapng", 3, 1200), "drive.pcapng: record 3 at offset 1200");
-    EXPECT_EQ(placeInFile("drive.pcapng", 0, 0), "drive.pcapng");
+    EXPECT_EQ(positionInFile("drive.pcapng", 3, 1200), "drive.pcapng: record 3 at offset 1200");
+    EXPECT_EQ(positionInFile("drive.pcapng", 0, 0), "drive.pcapng");
     EXPECT_EQ(fileTitle("-"), "standard input");
     EXPECT_EQ(fileTitle("a"), "a");
 }

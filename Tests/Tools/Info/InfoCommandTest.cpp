@@ -54,7 +54,7 @@ TEST_F(InfoCommandTest, CountsMessagesByLogCodeWithTheirSections) {
                                     "  0x1234            1  -\n"
                                     "  0x512C            3  GSM RR Info\n"
                                     "0xFF0000            1  SIM Info\n");
-    EXPECT_EQ(ownWords(process.errors()), "");
+    EXPECT_EQ(ownMessages(process.errors()), "");
 }
 
 TEST_F(InfoCommandTest, SerializedObjectsHaveNoLogCodes) {
@@ -98,7 +98,7 @@ TEST_F(InfoCommandTest, LossIsShownAndMakesTheInputBad) {
                                     "\n"
                                     "    code     messages  sections\n"
                                     "  0x512C            1  GSM RR Info\n");
-    EXPECT_EQ(ownWords(process.errors()), "velmora-log: " + path("cut.pcapng") + ": " + place);
+    EXPECT_EQ(ownMessages(process.errors()), "velmora-log: " + path("cut.pcapng") + ": " + place);
 }
 
 TEST_F(InfoCommandTest, RecordingWithoutATechnologyIsCountedAllTheSame) {
@@ -108,7 +108,7 @@ TEST_F(InfoCommandTest, RecordingWithoutATechnologyIsCountedAllTheSame) {
     EXPECT_THAT(process.output(), testing::StartsWith("form:       recording\ntechnology: not named\n"));
     EXPECT_THAT(process.output(), testing::EndsWith("  0x512C            1  -\n"));
     EXPECT_EQ(
-        ownWords(process.errors()),
+        ownMessages(process.errors()),
         "velmora-log: " + path("none.pcapng") +
             ": names no technology, wanted one of IFX, Ostrel_GSM, Ostrel_CDMA, Ostrel_LTE, Ostrel_UTRAN2\n");
 }
@@ -153,7 +153,7 @@ TEST_F(InfoCommandTest, FileThatIsNotThereIsTold) {
     ToolProcess process(tool({"info", path("gone.pcapng")}));
     EXPECT_EQ(process.exitStatus(), 1);
     EXPECT_EQ(process.output(), "");
-    EXPECT_EQ(ownWords(process.errors()),
+    EXPECT_EQ(ownMessages(process.errors()),
               "velmora-log: " + path("gone.pcapng") + ": cannot open: No such file or directory\n");
 }
 

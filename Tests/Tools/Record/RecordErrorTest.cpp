@@ -56,7 +56,7 @@ TEST_F(RecordErrorTest, FileThatMayNotGrowIsWrittenWhenItMay) {
     ASSERT_TRUE(fileHolds(6));
     process.signal(SIGINT);
     EXPECT_EQ(process.exitStatus(), 0);
-    EXPECT_EQ(ownWords(process.errors()),
+    EXPECT_EQ(ownMessages(process.errors()),
               words({_waiting, _file + " can be written again; no messages were dropped",
                      "recorded 6 messages of Ostrel_GSM, 102 bytes"}));
     EXPECT_THAT(messagesOf("drive.pcapng", "Ostrel_GSM"),
@@ -82,7 +82,7 @@ TEST_F(RecordErrorTest, MessagesThatFindNoRoomAreCounted) {
     process.signal(SIGINT);
     EXPECT_EQ(process.exitStatus(), 1);
     EXPECT_EQ(
-        ownWords(process.errors()),
+        ownMessages(process.errors()),
         words({_waiting, "32 MiB of messages wait for " + _file + "; further ones are dropped",
                _file + " can be written again; 1 messages were dropped",
                "recorded 3 messages of Ostrel_GSM, 25165841 bytes", "1 messages are missing from " + _file}));
@@ -103,7 +103,7 @@ TEST_F(RecordErrorTest, MessagesThatAreNotSavedInTheEndAreTold) {
     ASSERT_TRUE(process.waitForError("messages wait\n"));
     process.signal(SIGINT);
     EXPECT_EQ(process.exitStatus(), 1);
-    EXPECT_EQ(ownWords(process.errors()),
+    EXPECT_EQ(ownMessages(process.errors()),
               words({_waiting, _full, "recorded 1 messages of Ostrel_GSM, 17 bytes",
                      "2 messages are missing from " + _file}));
     EXPECT_THAT(messagesOf("drive.pcapng", "Ostrel_GSM"), ElementsAre(rrState(1)));
@@ -125,7 +125,7 @@ TEST_F(RecordErrorTest, ServiceThatGoesAndComesBackIsTold) {
     ASSERT_TRUE(fileHolds(2));
     process.signal(SIGTERM);
     EXPECT_EQ(process.exitStatus(), 0);
-    EXPECT_EQ(ownWords(process.errors()),
+    EXPECT_EQ(ownMessages(process.errors()),
               words({_gone, "the telephony service is back", "recorded 2 messages of Ostrel_GSM, 34 bytes"}));
 }
 

@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Tools/LogSubstitute.h"
+#include "Tools/LogOverride.h"
 
 #include "Platform/Console.h"
 #include "Tests/Support/CapturedLog.h"
@@ -13,10 +13,10 @@ namespace {
 
 using testing::ElementsAre;
 
-TEST(HeldLogTest, PassesLinesOnInTheEndAtTheLogsOwnLevel) {
+TEST(DeferredLogTest, PassesLinesOnInTheEndAtTheLogsOwnLevel) {
     CapturedLog log(LogPriority::Error);
     {
-        HeldLog held;
+        DeferredLog held;
         logLine(LogPriority::Error, "first");
         logLine(LogPriority::Warning, "not wanted");
         logLine(LogPriority::Error, "second");
@@ -29,25 +29,25 @@ TEST(HeldLogTest, PassesLinesOnInTheEndAtTheLogsOwnLevel) {
     EXPECT_THAT(log.textsAt(LogPriority::Error), ElementsAre("first", "second", "third"));
 }
 
-TEST(HeldLogTest, KeepsTheLatestLinesAndTellsHowManyAreMissing) {
+TEST(DeferredLogTest, KeepsTheLatestLinesAndTellsHowManyAreMissing) {
     CapturedLog log;
     {
-        HeldLog held;
-        for (std::size_t i = 0; i < HeldLog::maximumLines + 3; ++i)
+        DeferredLog held;
+        for (std::size_t i = 0; i < DeferredLog::maximumLines + 3; ++i)
             logLine(LogPriority::Notice, "line " + std::to_string(i));
     }
     EXPECT_THAT(log.textsAt(LogPriority::Error), ElementsAre("3 earlier lines left out"));
     const auto lines = log.textsAt(LogPriority::Notice);
-    ASSERT_EQ(lines.size(), HeldLog::maximumLines);
+    ASSERT_EQ(lines.size(), DeferredLog::maximumLines);
     EXPECT_EQ(lines.front(), "line 3");
     EXPECT_EQ(lines.back(), "line 202");
 }
 
-TEST(HeldLogTest, HoldsTheConsoleTooAndTellsNothingTwice) {
+TEST(DeferredLogTest, HoldsTheConsoleTooAndTellsNothingTwice) {
     testing::internal::CaptureStderr();
     std::FILE* earlier = redirectConsole(stderr);
     {
-        HeldLog held;
+        DeferredLog held;
         printLine("gone");
         std::fputs("between ", stderr);
         held.release();

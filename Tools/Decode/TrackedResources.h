@@ -14,12 +14,12 @@ namespace velmora {
 /// Stands in for the process's resources while it lives, and remembers the first that could not be read. A
 /// decoder logs that and goes on without its template, as it does on a phone, but what it then shows is not
 /// what the file holds. Main thread only; the destructor restores the earlier resources.
-class NotedResources final : public Resources {
+class TrackedResources final : public Resources {
 public:
-    NotedResources() : _others(setResources(this)) {}
-    ~NotedResources() override { setResources(_others); }
-    NotedResources(const NotedResources&) = delete;
-    NotedResources& operator=(const NotedResources&) = delete;
+    TrackedResources() : _others(setResources(this)) {}
+    ~TrackedResources() override { setResources(_others); }
+    TrackedResources(const TrackedResources&) = delete;
+    TrackedResources& operator=(const TrackedResources&) = delete;
 
     [[nodiscard]] Result<Data> read(std::string_view name, std::string_view type) const override {
         Result<Data> content = _others->read(name, type);

@@ -15,12 +15,12 @@ namespace velmora {
 
 /// Replaces the process's system log while it lives, at the log's own level; the destructor restores it. The
 /// ones below keep log lines from running into what a command shows on the same terminal.
-class LogSubstitute : public SystemLog {
+class LogOverride : public SystemLog {
 public:
-    LogSubstitute();
-    ~LogSubstitute() override;
-    LogSubstitute(const LogSubstitute&) = delete;
-    LogSubstitute& operator=(const LogSubstitute&) = delete;
+    LogOverride();
+    ~LogOverride() override;
+    LogOverride(const LogOverride&) = delete;
+    LogOverride& operator=(const LogOverride&) = delete;
 
 protected:
     void pass(int priority, std::string_view text);
@@ -32,12 +32,12 @@ private:
 
 /// Holds the latest lines, those of the console as well, while the screen is in use, and passes them on
 /// afterwards.
-class HeldLog final : public LogSubstitute {
+class DeferredLog final : public LogOverride {
 public:
     static constexpr std::size_t maximumLines = 200;
 
-    HeldLog();
-    ~HeldLog() override;
+    DeferredLog();
+    ~DeferredLog() override;
     void write(int priority, std::string_view text) override;
     /// Writes the deferred lines now.
     void release();
@@ -52,7 +52,7 @@ private:
 };
 
 /// One line on standard error that is rewritten in place. A log line replaces it until the next `show`.
-class ProgressLine final : public LogSubstitute {
+class ProgressLine final : public LogOverride {
 public:
     ~ProgressLine() override { clear(); }
     void show(std::string_view text);

@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Tools/LogSubstitute.h"
+#include "Tools/LogOverride.h"
 
 #include "Platform/Console.h"
 
@@ -9,22 +9,22 @@
 
 namespace velmora {
 
-LogSubstitute::LogSubstitute() : _level(detail::systemLogLevel), _earlier(setSystemLog(this, _level)) {}
+LogOverride::LogOverride() : _level(detail::systemLogLevel), _earlier(setSystemLog(this, _level)) {}
 
-LogSubstitute::~LogSubstitute() {
+LogOverride::~LogOverride() {
     setSystemLog(_earlier, _level);
 }
 
-void LogSubstitute::pass(int priority, std::string_view text) {
+void LogOverride::pass(int priority, std::string_view text) {
     if (_earlier)
         _earlier->write(priority, text);
 }
 
-HeldLog::HeldLog()
+DeferredLog::DeferredLog()
     : _console(::open_memstream(&_consoleText, &_consoleSize)),
       _earlierConsole(redirectConsole(_console ? _console : stderr)) {}
 
-HeldLog::~HeldLog() {
+DeferredLog::~DeferredLog() {
     redirectConsole(_earlierConsole);
     release();
     if (_console)
@@ -32,7 +32,7 @@ HeldLog::~HeldLog() {
     std::free(_consoleText);
 }
 
-void HeldLog::write(int priority, std::string_view text) {
+void DeferredLog::write(int priority, std::string_view text) {
     if (_lines.size() == maximumLines) {
         _lines.pop_front();
         ++_leftOut;
@@ -40,7 +40,7 @@ void HeldLog::write(int priority, std::string_view text) {
     _lines.emplace_back(priority, text);
 }
 
-void HeldLog::release() {
+void DeferredLog::release() {
     if (_leftOut != 0)
         pass(LogPriority::Error, std::to_string(_leftOut) + " earlier lines left out");
     for (const auto& [priority, text] : _lines)
