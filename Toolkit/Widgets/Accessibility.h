@@ -18,7 +18,7 @@ void installAccessibility();
 /// Announces an event of the widget to screen readers.
 void announce(QWidget& widget, QAccessible::Event what);
 /// Whether a screen reader or a test listens.
-[[nodiscard]] bool announcementsAreHeard();
+[[nodiscard]] bool hasAnnouncementListener();
 
 using AnnouncementListener = std::function<void(QWidget& widget, QAccessible::Event what)>;
 /// Sets a test's listener; null removes it.

@@ -27,7 +27,7 @@ public:
     void present(bool animated);
     void dismiss(bool animated);
     /// The presenter is being destroyed: removes the sheet without notifications.
-    void abandon();
+    void discard();
 
 private:
     void layout();

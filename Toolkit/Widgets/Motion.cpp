@@ -18,7 +18,7 @@ constexpr int duration_ms = 250;
 
 } // namespace
 
-bool wantsMotion() {
+bool animationsEnabled() {
     const QByteArray asked = qgetenv("VELMORA_REDUCED_MOTION");
     return (asked.isEmpty() || asked == "0") &&
            QApplication::style()->styleHint(QStyle::SH_Widget_Animation_Duration) > 0;
@@ -38,7 +38,7 @@ void Motion::start(bool animated, Step step, std::function<void()> atEnd) {
     _atEnd = std::move(atEnd);
     auto* const animation = new QVariantAnimation;
     _animation = animation;
-    if (!animated || !wantsMotion()) {
+    if (!animated || !animationsEnabled()) {
         finish();
         return;
     }

@@ -14,7 +14,7 @@ namespace velmora {
 
 /// Whether animations are enabled: neither the user's style nor the environment (VELMORA_REDUCED_MOTION set
 /// to anything but 0) asks for reduced motion.
-[[nodiscard]] bool wantsMotion();
+[[nodiscard]] bool animationsEnabled();
 
 /// One animation at a time, from 0 to 1, that can be ended early. Its owner may be destroyed in its
 /// callbacks.

@@ -20,7 +20,7 @@ public:
 
     std::function<void()> onResize;
     /// Called when the window is destroyed with this.
-    std::function<void()> onGone;
+    std::function<void()> onDestroyed;
     std::function<void()> onCancel;
     std::function<void()> onSave;
 

@@ -32,7 +32,7 @@ void SpinnerWidget::setSpinning(bool spins) {
 }
 
 void SpinnerWidget::updateTimer(bool isShown) {
-    const bool turns = _isSpinning && isShown && wantsMotion();
+    const bool turns = _isSpinning && isShown && animationsEnabled();
     if (turns && !_timer.isActive())
         _timer.start(step_ms, this);
     else if (!turns)

@@ -40,7 +40,7 @@ private:
 
     TableWidget& _table;
     std::optional<std::size_t> _pressed;
-    QPointer<ScrollWidget> _underFinger;
+    QPointer<ScrollWidget> _underTouch;
 };
 
 } // namespace velmora

@@ -36,7 +36,7 @@ public:
 
     void reload();
     /// Loads the rows if they are not loaded yet.
-    void loadOnce();
+    void loadIfNeeded();
     [[nodiscard]] std::shared_ptr<TableCell> dequeue(std::string_view identifier);
     void releaseCells();
 
@@ -60,7 +60,7 @@ public:
     void setShowsFocus(bool shows);
     void scrollToRow(std::size_t row);
     /// Selects the row and notifies the delegate, which may destroy the table.
-    void choose(std::size_t row);
+    void activateRow(std::size_t row);
 
 protected:
     void resizeEvent(QResizeEvent* event) override;

@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Toolkit/Widgets/Finger.h"
+#include "Toolkit/Widgets/TouchScroll.h"
 
 #include <QScroller>
 #include <QTouchEvent>
@@ -9,7 +9,7 @@
 
 namespace velmora {
 
-bool followFinger(QWidget& widget, const QTouchEvent& event) {
+bool scrollByTouch(QWidget& widget, const QTouchEvent& event) {
     // The scroller is fed by hand: a gesture recognizer, which could do it, is never freed.
     QScroller* const scroller = QScroller::scroller(&widget);
     if (event.points().isEmpty() || event.type() == QEvent::TouchCancel) {
