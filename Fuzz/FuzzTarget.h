@@ -25,15 +25,15 @@ public:
 };
 
 /// An invariant of a target is violated.
-class BrokenPromise : public std::runtime_error {
+class BrokenInvariant : public std::runtime_error {
 public:
     using std::runtime_error::runtime_error;
 };
 
-/// Throws BrokenPromise with the invariant's text unless it holds.
-inline void require(bool holds, const char* promise) {
+/// Throws BrokenInvariant with the invariant's text unless it holds.
+inline void require(bool holds, const char* invariant) {
     if (!holds)
-        throw BrokenPromise(promise);
+        throw BrokenInvariant(invariant);
 }
 
 } // namespace velmora

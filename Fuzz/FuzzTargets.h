@@ -13,7 +13,7 @@
 namespace velmora {
 
 /// A seed corpus with a dictionary of tokens.
-struct FuzzMaterial {
+struct FuzzCorpus {
     std::vector<Data> seeds;  ///< small valid inputs
     std::vector<Data> tokens; ///< tokens for mutation; at most 64 bytes each
 };
@@ -22,7 +22,7 @@ struct FuzzMaterial {
 struct FuzzTargetKind {
     std::string_view name;
     std::unique_ptr<FuzzTarget> (*make)();
-    FuzzMaterial (*material)(); ///< the same whenever it is called
+    FuzzCorpus (*corpus)(); ///< the same whenever it is called
     /// The maximum input length: enough for everything that a target does.
     std::size_t maximumLength = 1024;
 };

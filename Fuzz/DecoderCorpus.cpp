@@ -1,10 +1,10 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
+#include "Fuzz/CorpusTools.h"
 #include "Fuzz/DecoderSession.h"
 #include "Fuzz/DriveMessages.h"
-#include "Fuzz/FuzzMaterials.h"
-#include "Fuzz/MaterialTools.h"
+#include "Fuzz/FuzzCorpora.h"
 #include "Fuzz/MessageScript.h"
 #include "Tests/Support/Hex.h"
 
@@ -28,7 +28,7 @@ void append(Script& script, const Data& message) {
 }
 
 /// Three messages with redraws and a reconnection in between.
-Script aTurn(const Data& first, const Data& second, const Data& third) {
+Script threeSteps(const Data& first, const Data& second, const Data& third) {
     Script script;
     append(script, first);
     append(script, {MessageScript::Kind::Redraw, {}});
@@ -53,35 +53,35 @@ void addRecordTokens(const std::vector<Data>& scripts, std::vector<Data>& tokens
 
 } // namespace
 
-FuzzMaterial decoderMaterial(std::string_view scenario) {
-    FuzzMaterial material;
+FuzzCorpus decoderCorpus(std::string_view scenario) {
+    FuzzCorpus corpus;
     const std::vector<Data> messages = driveMessages(scenario, drive, 2);
     for (const Data& message : messages) {
         Script script;
         append(script, message);
-        material.seeds.emplace_back(std::move(script));
+        corpus.seeds.emplace_back(std::move(script));
     }
-    addRecordTokens(material.seeds, material.tokens);
+    addRecordTokens(corpus.seeds, corpus.tokens);
     for (std::size_t i = 0; i < messages.size(); ++i)
-        material.seeds.emplace_back(
-            aTurn(messages[i], messages[(i + 1) % messages.size()], messages[(i + 2) % messages.size()]));
+        corpus.seeds.emplace_back(threeSteps(messages[i], messages[(i + 1) % messages.size()],
+                                             messages[(i + 2) % messages.size()]));
     for (const Data& token : propertyListTokens())
-        material.tokens.push_back(token);
-    return material;
+        corpus.tokens.push_back(token);
+    return corpus;
 }
 
-FuzzMaterial sameLabelsMaterial() {
-    FuzzMaterial material;
+FuzzCorpus sameLabelsCorpus() {
+    FuzzCorpus corpus;
     for (std::size_t i = 0; i < std::size(fuzzedTechnologies); ++i) {
         // A turn and then the first of its messages once more, so that this is known on one side alone.
-        const FuzzMaterial decoder = decoderMaterial(fuzzedTechnologies[i].scenario);
+        const FuzzCorpus decoder = decoderCorpus(fuzzedTechnologies[i].scenario);
         const std::size_t messages = decoder.seeds.size() / 2;
         for (std::size_t j = 0; j < messages; ++j)
-            material.seeds.push_back(behind(static_cast<std::uint8_t>(i),
-                                            joined(decoder.seeds[messages + j], decoder.seeds[j]).bytes()));
-        material.tokens.insert(material.tokens.end(), decoder.tokens.begin(), decoder.tokens.end());
+            corpus.seeds.push_back(behind(static_cast<std::uint8_t>(i),
+                                          joined(decoder.seeds[messages + j], decoder.seeds[j]).bytes()));
+        corpus.tokens.insert(corpus.tokens.end(), decoder.tokens.begin(), decoder.tokens.end());
     }
-    return material;
+    return corpus;
 }
 
 } // namespace velmora

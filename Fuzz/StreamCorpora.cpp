@@ -1,9 +1,9 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
+#include "Fuzz/CorpusTools.h"
 #include "Fuzz/DriveMessages.h"
-#include "Fuzz/FuzzMaterials.h"
-#include "Fuzz/MaterialTools.h"
+#include "Fuzz/FuzzCorpora.h"
 #include "Platform/Linux/Ports/Frame.h"
 #include "Recording/Pcapng/Pcapng.h"
 #include "Tests/Recording/PcapngFile.h"
@@ -53,8 +53,8 @@ Data mergedFile(bool bigEndian, const std::vector<Data>& messages) {
 
 } // namespace
 
-FuzzMaterial frameMaterial() {
-    FuzzMaterial material;
+FuzzCorpus frameCorpus() {
+    FuzzCorpus corpus;
     const std::vector<Data> messages = someMessages();
     std::vector<std::uint8_t> all;
     std::uint32_t serial = 0;
@@ -62,36 +62,36 @@ FuzzMaterial frameMaterial() {
         for (const Data& message : messages) {
             std::vector<std::uint8_t> one;
             putFrame(one, {kind, true, -1, ++serial, message});
-            material.seeds.push_back(behind(3, one));
+            corpus.seeds.push_back(behind(3, one));
             all.insert(all.end(), one.begin(), one.end());
         }
     }
     putFrame(all, {FrameKind::Reply, false, 0, 7, {}});
     for (const std::uint8_t piece : std::initializer_list<std::uint8_t>{0, 15, 255})
-        material.seeds.push_back(behind(piece, all));
+        corpus.seeds.push_back(behind(piece, all));
     for (const std::uint8_t flags : std::initializer_list<std::uint8_t>{1, 2, 4, 10})
-        material.tokens.push_back(behind(flags, std::array<std::uint8_t, 3>{}));
-    return material;
+        corpus.tokens.push_back(behind(flags, std::array<std::uint8_t, 3>{}));
+    return corpus;
 }
 
-FuzzMaterial recordingMaterial() {
-    FuzzMaterial material;
+FuzzCorpus recordingCorpus() {
+    FuzzCorpus corpus;
     const std::vector<Data> messages = someMessages();
     for (const bool bigEndian : {false, true}) {
         PcapngFile file(bigEndian);
-        material.seeds.push_back(behind(0, file.head().data().bytes()));
+        corpus.seeds.push_back(behind(0, file.head().data().bytes()));
         std::uint64_t stamp = 1'700'000'000'000'000'000;
         for (const Data& message : messages)
             file.message(++stamp, message.bytes());
-        material.seeds.push_back(behind(1, file.data().bytes()));
-        material.seeds.push_back(behind(2, mergedFile(bigEndian, messages).bytes()));
+        corpus.seeds.push_back(behind(1, file.data().bytes()));
+        corpus.seeds.push_back(behind(2, mergedFile(bigEndian, messages).bytes()));
         for (const std::uint32_t type : {0x0A0D0D0Au, 1u, 2u, 3u, 4u, 5u, 6u, 0x1A2B3C4Du})
-            material.tokens.push_back(file.number(type, 4));
+            corpus.tokens.push_back(file.number(type, 4));
     }
-    return material;
+    return corpus;
 }
 
-FuzzMaterial sourceStringMaterial() {
+FuzzCorpus sourceStringCorpus() {
     constexpr std::string_view seeds[] = {
         "scenario:gsm",
         "scenario:lte,seed=18446744073709551615,speed=0.25",

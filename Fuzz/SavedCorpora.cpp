@@ -1,10 +1,10 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
+#include "Fuzz/CorpusTools.h"
 #include "Fuzz/DecoderSession.h"
 #include "Fuzz/DriveMessages.h"
-#include "Fuzz/FuzzMaterials.h"
-#include "Fuzz/MaterialTools.h"
+#include "Fuzz/FuzzCorpora.h"
 #include "LogMessages/LogMessage.h"
 
 namespace velmora {
@@ -39,25 +39,25 @@ Value savedContents(const FuzzedTechnology& technology, std::size_t perRedraw) {
 
 } // namespace
 
-FuzzMaterial dlfMaterial() {
-    FuzzMaterial material;
+FuzzCorpus dlfCorpus() {
+    FuzzCorpus corpus;
     for (std::size_t i = 0; i < binaryTechnologies; ++i) {
         for (const std::size_t perRedraw : {1u, 2u, 3u}) {
             const Value contents = savedContents(fuzzedTechnologies[i], perRedraw);
             const Array& entries = *contents.asArray();
             const Data* log = (*entries[entries.size() - 1].asDictionary())["DLF"].asData();
-            material.seeds.push_back(behind(static_cast<std::uint8_t>(perRedraw - 1), log->bytes()));
+            corpus.seeds.push_back(behind(static_cast<std::uint8_t>(perRedraw - 1), log->bytes()));
         }
     }
     for (const std::uint8_t begin :
          {LogMessage::basebandType, LogMessage::prefixMarker, LogMessage::extraType})
-        material.tokens.push_back(behind(begin, {}));
-    material.tokens.emplace_back(std::vector<std::uint8_t>{0xA1, 0x00, 0xFD, 0x1F});
-    return material;
+        corpus.tokens.push_back(behind(begin, {}));
+    corpus.tokens.emplace_back(std::vector<std::uint8_t>{0xA1, 0x00, 0xFD, 0x1F});
+    return corpus;
 }
 
-FuzzMaterial snapshotMaterial() {
-    FuzzMaterial material = {{}, propertyListTokens()};
+FuzzCorpus snapshotCorpus() {
+    FuzzCorpus corpus = {{}, propertyListTokens()};
     for (const FuzzedTechnology& technology : fuzzedTechnologies) {
         const DictionaryRef snapshot = makeDictionary();
         snapshot->set("Timestamp", "2026-11-16 05:00:08 +0000");
@@ -66,12 +66,12 @@ FuzzMaterial snapshotMaterial() {
         std::vector<Data> forms;
         addBothForms(forms, snapshot);
         for (const Data& form : forms)
-            material.seeds.push_back(behind(255, form.bytes()));
+            corpus.seeds.push_back(behind(255, form.bytes()));
     }
     for (const char* key :
          {"Timestamp", "Data", "Description", "DisplayState", "Display", "ExtraInfo", "Date", "DLF"})
-        material.tokens.push_back(textData(key));
-    return material;
+        corpus.tokens.push_back(textData(key));
+    return corpus;
 }
 
 } // namespace velmora

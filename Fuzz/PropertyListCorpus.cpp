@@ -1,10 +1,10 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
+#include "Fuzz/CorpusTools.h"
 #include "Fuzz/DecoderSession.h"
 #include "Fuzz/DriveMessages.h"
-#include "Fuzz/FuzzMaterials.h"
-#include "Fuzz/MaterialTools.h"
+#include "Fuzz/FuzzCorpora.h"
 #include "LogMessages/LogMessage.h"
 #include "Tests/PropertyLists/PropertyListSamples.h"
 
@@ -72,27 +72,27 @@ std::vector<Data> propertyListTokens() {
     return textDatas(xmlWords);
 }
 
-FuzzMaterial propertyListMaterial() {
-    FuzzMaterial material{{}, propertyListTokens()};
-    addLists(material.seeds, "gsm");
-    addLists(material.seeds, "ifx");
-    addBothForms(material.seeds, everyKind());
-    addBothForms(material.seeds, nestedArrays(PropertyListLimits{}.maximumDepth));
+FuzzCorpus propertyListCorpus() {
+    FuzzCorpus corpus{{}, propertyListTokens()};
+    addLists(corpus.seeds, "gsm");
+    addLists(corpus.seeds, "ifx");
+    addBothForms(corpus.seeds, everyKind());
+    addBothForms(corpus.seeds, nestedArrays(PropertyListLimits{}.maximumDepth));
     for (const Value& list : shippedTemplates())
-        addBothForms(material.seeds, list);
-    return material;
+        addBothForms(corpus.seeds, list);
+    return corpus;
 }
 
-FuzzMaterial templateMaterial() {
-    FuzzMaterial material{{}, propertyListTokens()};
+FuzzCorpus templateCorpus() {
+    FuzzCorpus corpus{{}, propertyListTokens()};
     const std::vector<Value> templates = shippedTemplates();
     for (std::size_t i = 0; i < templates.size(); ++i) {
         std::vector<Data> forms;
         addBothForms(forms, templates[i]);
         for (const Data& form : forms)
-            material.seeds.push_back(behind(static_cast<std::uint8_t>(i), form.bytes()));
+            corpus.seeds.push_back(behind(static_cast<std::uint8_t>(i), form.bytes()));
     }
-    return material;
+    return corpus;
 }
 
 } // namespace velmora

@@ -12,17 +12,17 @@
 
 namespace velmora {
 
-[[nodiscard]] FuzzMaterial propertyListMaterial();
+[[nodiscard]] FuzzCorpus propertyListCorpus();
 /// The words of its XML form, and the mark of the binary one.
 [[nodiscard]] std::vector<Data> propertyListTokens();
 /// Of the technology of that scenario: scripts of its messages.
-[[nodiscard]] FuzzMaterial decoderMaterial(std::string_view scenario);
-[[nodiscard]] FuzzMaterial sameLabelsMaterial();
-[[nodiscard]] FuzzMaterial templateMaterial();
-[[nodiscard]] FuzzMaterial frameMaterial();
-[[nodiscard]] FuzzMaterial recordingMaterial();
-[[nodiscard]] FuzzMaterial dlfMaterial();
-[[nodiscard]] FuzzMaterial snapshotMaterial();
-[[nodiscard]] FuzzMaterial sourceStringMaterial();
+[[nodiscard]] FuzzCorpus decoderCorpus(std::string_view scenario);
+[[nodiscard]] FuzzCorpus sameLabelsCorpus();
+[[nodiscard]] FuzzCorpus templateCorpus();
+[[nodiscard]] FuzzCorpus frameCorpus();
+[[nodiscard]] FuzzCorpus recordingCorpus();
+[[nodiscard]] FuzzCorpus dlfCorpus();
+[[nodiscard]] FuzzCorpus snapshotCorpus();
+[[nodiscard]] FuzzCorpus sourceStringCorpus();
 
 } // namespace velmora
