@@ -72,7 +72,7 @@ protected:
     /// Serves events until the condition holds; false after twenty seconds.
     bool eventually(const std::function<bool()>& condition);
     /// Serves the events that are there.
-    void settle();
+    void runUntilIdle();
 
     [[nodiscard]] static Value dictionary(std::initializer_list<Dictionary::Entry> entries) {
         return Value(std::make_shared<Dictionary>(entries));

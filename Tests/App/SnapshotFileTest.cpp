@@ -88,7 +88,7 @@ TEST_F(SnapshotFileTest, OfABinaryFamilyHasTheWholeLogToo) {
     launchAndConnect();
     ASSERT_TRUE(platform.ports.deliver(logChannelPortName(), 0, record(0x7132, "01 00 00")));
     platform.queue.advance(2s);
-    settle();
+    runUntilIdle();
     open();
     // The version report of 161 bytes, and the 16-byte record less its type byte.
     EXPECT_THAT(listed(), ElementsAre("Snapshot (2026-11-16 05:00:02 +0000)", "DLF binary (176 bytes)"));
@@ -178,7 +178,7 @@ TEST_F(SnapshotFileTest, ValueThatAListCannotCarryIsAFailedWrite) {
     ASSERT_TRUE(message);
     ASSERT_TRUE(platform.ports.deliver(logChannelPortName(), 0, Data::copyOf(*message)));
     platform.queue.advance(2s);
-    settle();
+    runUntilIdle();
     open();
     save();
     EXPECT_THAT(files(), testing::IsEmpty());

@@ -36,7 +36,7 @@ protected:
     }
     void press(Qt::Key key, Qt::KeyboardModifiers modifiers = {}) {
         QTest::keyClick(topPane()->view().widget()->window()->windowHandle(), key, modifiers);
-        settle();
+        runUntilIdle();
     }
 };
 
@@ -133,7 +133,7 @@ TEST_F(VelmoraPaneControllerTest, RowsAreLaidOutAnewWhenTheWindowChangesItsWidth
     QWidget* window = pane(0)->view().widget()->window();
     window->resize(window->width() + 300, window->height());
     ASSERT_TRUE(eventually([&] { return pane(0)->tableView().bounds().width >= window->width(); }));
-    settle();
+    runUntilIdle();
     const auto row = cell(*pane(0), 1);
     EXPECT_EQ(row->contentView().bounds().width, window->width());
     EXPECT_EQ(row->value()->frame().x, window->width() - row->value()->frame().width);

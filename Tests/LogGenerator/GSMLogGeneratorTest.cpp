@@ -6,7 +6,7 @@
 #include "LogGenerator/GSM/AssertionFailure.h"
 #include "PropertyLists/PropertyList.h"
 #include "Tests/Support/FakeClock.h"
-#include "Tests/Support/NotedEffects.h"
+#include "Tests/Support/RecordedEffects.h"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
@@ -130,10 +130,10 @@ TEST_F(GSMLogGeneratorTest, EachMessageReplacesTheWholeDisplay) {
 }
 
 TEST_F(GSMLogGeneratorTest, MessageConcernsTheWholeDisplay) {
-    NotedEffects effects;
+    RecordedEffects effects;
     generator.updateStateTelling(state, Data(*writeBinaryPropertyList(dictionary({{"Band", "900"}}))),
                                  effects);
-    EXPECT_EQ(effects.kind, NotedEffects::Kind::Display);
+    EXPECT_EQ(effects.kind, RecordedEffects::Kind::Display);
     EXPECT_EQ(effects.messages, 1);
     ASSERT_EQ(effects.members.size(), 1U);
     EXPECT_EQ(effects.members[0].second.asDictionary(), state["Display"].asDictionary());

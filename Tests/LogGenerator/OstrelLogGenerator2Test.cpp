@@ -7,7 +7,7 @@
 #include "Tests/Support/FakeClock.h"
 #include "Tests/Support/FakeResources.h"
 #include "Tests/Support/Hex.h"
-#include "Tests/Support/NotedEffects.h"
+#include "Tests/Support/RecordedEffects.h"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
@@ -126,13 +126,13 @@ std::vector<std::uint32_t> codesOf(const Listener& section) {
 TEST_P(FramingTest, TellingOfItDoesTheSame) {
     log.clear();
     const Data message = hex(GetParam().bytes);
-    NotedEffects effects;
+    RecordedEffects effects;
     generator.updateStateTelling(state, message, effects);
     EXPECT_EQ(codesOf(index->baseband), GetParam().basebandCodes);
     EXPECT_EQ(codesOf(index->extra), GetParam().extraCodes);
     EXPECT_EQ(log.textsAt(LogPriority::Error), GetParam().errors);
     EXPECT_EQ(raw(), message);
-    EXPECT_EQ(effects.kind, NotedEffects::Kind::Sections);
+    EXPECT_EQ(effects.kind, RecordedEffects::Kind::Sections);
     EXPECT_EQ(effects.messages, 1);
     for (const std::vector<std::uint32_t>& codes : {GetParam().basebandCodes, GetParam().extraCodes})
         if (!codes.empty()) {
@@ -144,7 +144,7 @@ TEST_P(FramingTest, TellingOfItDoesTheSame) {
 }
 
 TEST_F(TemplateTest, SectionsOfACodeAreToldWithTheirNodesAsTheyThenStand) {
-    NotedEffects effects;
+    RecordedEffects effects;
     generator.updateStateTelling(state, record(0x1234, "00 00"), effects);
     EXPECT_EQ(effects.code, 0x1234U);
     ASSERT_EQ(effects.members.size(), 2U);
@@ -180,7 +180,7 @@ TEST_F(TemplateTest, SectionOfACodeListedTwiceIsToldOnceAndOneWithoutANodeIsNot)
     };
     const auto odd = std::make_shared<OddIndex>();
     OstrelLogGenerator2 other("Probe", odd, clock);
-    NotedEffects effects;
+    RecordedEffects effects;
     Dictionary fresh;
     other.updateStateTelling(fresh, record(0x1234, ""), effects);
     EXPECT_EQ(odd->twice.calls.size(), 2U);

@@ -27,9 +27,9 @@ Data counting(std::size_t words) {
 
 constexpr std::size_t smallChunk = 8192;
 
-class ChunkedInputPieces : public testing::TestWithParam<std::size_t> {};
+class ChunkedInputReads : public testing::TestWithParam<std::size_t> {};
 
-TEST_P(ChunkedInputPieces, keepPartsGoodWhileTheInputMovesOn) {
+TEST_P(ChunkedInputReads, keepPartsGoodWhileTheInputMovesOn) {
     const Data content = counting(20'000);
     ChunkedInput input(std::make_unique<MemorySource>(content, GetParam()), smallChunk);
     std::vector<Data> parts;
@@ -46,7 +46,7 @@ TEST_P(ChunkedInputPieces, keepPartsGoodWhileTheInputMovesOn) {
     EXPECT_FALSE(input.failure());
 }
 
-INSTANTIATE_TEST_SUITE_P(Sizes, ChunkedInputPieces, testing::Values(1, 5, 4096, SIZE_MAX));
+INSTANTIATE_TEST_SUITE_P(Sizes, ChunkedInputReads, testing::Values(1, 5, 4096, SIZE_MAX));
 
 TEST(ChunkedInput, usesAChunkAgainThatNobodyHolds) {
     ChunkedInput input(std::make_unique<MemorySource>(counting(20'000)), smallChunk);

@@ -17,7 +17,7 @@ namespace velmora {
 namespace {
 
 QImage picture(QWidget& widget) {
-    settle();
+    runUntilIdle();
     return widget.grab().toImage();
 }
 

@@ -235,7 +235,7 @@ TEST_F(NavigationMotionTest, AWindowThatIsResizedEndsTheMovement) {
     stage.show();
     push("child", true);
     stage.window.widget()->resize(500, 604);
-    settle();
+    runUntilIdle();
     EXPECT_EQ(diary.back(), "child:did appear");
     EXPECT_EQ(stage.stack->topViewController()->view().frame(), (Rect{0, 0, 500, 552}));
 }
@@ -251,7 +251,7 @@ TEST_F(NavigationMotionTest, AStackMayGoInMidMovement) {
     window.setRootViewController(nullptr);
     stack.reset();
     EXPECT_EQ(root->navigationController(), nullptr);
-    settle();
+    runUntilIdle();
 }
 
 } // namespace

@@ -38,7 +38,7 @@ protected:
                     onSave();
             }));
         stage.stack->topViewController()->setToolbarItems(std::move(items), true);
-        settle();
+        runUntilIdle();
     }
     [[nodiscard]] QWidget* item(const char* name) const { return find(stage.window, name); }
 
@@ -141,7 +141,7 @@ TEST_F(ToolbarTest, TheActionMayReplaceTheItems) {
     fill("text", false);
     QTest::mouseClick(item("velmora.save"), Qt::LeftButton);
     EXPECT_EQ(saves, 1);
-    settle();
+    runUntilIdle();
     EXPECT_EQ(item("velmora.save"), nullptr);
     QTest::keyClick(stage.window.widget(), Qt::Key_S, Qt::ControlModifier); // nothing to press
     EXPECT_EQ(saves, 1);

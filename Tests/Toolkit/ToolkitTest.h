@@ -29,7 +29,7 @@ namespace velmora {
 /// Serves events until `done`; fails after ten seconds.
 [[nodiscard]] bool eventually(const std::function<bool()>& done);
 /// Serves what is waiting to be served.
-void settle();
+void runUntilIdle();
 
 /// The visible widget of that name in the window, or null.
 [[nodiscard]] QWidget* find(const Window& window, const char* objectName);

@@ -9,7 +9,7 @@
 #include "Tests/Support/FakeClock.h"
 #include "Tests/Support/FakeResources.h"
 #include "Tests/Support/Hex.h"
-#include "Tests/Support/NotedEffects.h"
+#include "Tests/Support/RecordedEffects.h"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
@@ -34,7 +34,7 @@ protected:
     C2KLogGeneratorTest() {
         resources.put("C2KTemplate", "plist",
                       dictionary({{"Fingers", "kFingerC2I"},
-                                  {"Maker", "kNobodyMakesThis"},
+                                  {"Maker", "kUnusedKey"},
                                   {"EV-DO", dictionary({{"_sorted", "_sorted"},
                                                         {"2;Channel", "kChannel"},
                                                         {"1;PN Offset", "kServingPNOffset"},
@@ -103,7 +103,7 @@ TEST_F(C2KLogGeneratorTest, LookupNamesLabelAndScreenOfEveryValueKey) {
     std::vector<std::string> keys;
     for (const auto& [key, targets] : lookup)
         keys.push_back(key);
-    EXPECT_THAT(keys, ElementsAre("kFingerC2I", "kNobodyMakesThis", "kChannel", "kServingPNOffset"));
+    EXPECT_THAT(keys, ElementsAre("kFingerC2I", "kUnusedKey", "kChannel", "kServingPNOffset"));
     const Array& targets = *lookup["kFingerC2I"].asArray();
     ASSERT_EQ(targets.size(), 2u);
     const Dictionary& root = *state["Display"].asDictionary();
@@ -187,9 +187,9 @@ TEST_F(C2KLogGeneratorTest, Framing) {
 TEST_F(C2KLogGeneratorTest, ValuesThatAMessagePublishesAreTold) {
     build();
     const CapturedLog log;
-    NotedEffects effects;
+    RecordedEffects effects;
     generator->updateStateTelling(state, noFingers(), effects);
-    EXPECT_EQ(effects.kind, NotedEffects::Kind::Values);
+    EXPECT_EQ(effects.kind, RecordedEffects::Kind::Values);
     EXPECT_EQ(effects.code, 0x108AU);
     EXPECT_THAT(effects.members, ElementsAre(std::pair<std::string, Value>("kFingerC2I", "(none)")));
     EXPECT_EQ(display(), fingersShown);

@@ -13,7 +13,7 @@ namespace velmora {
 
 /// Records what a decoder has reported of messages: the latest message's code and the names and values, in
 /// order.
-class NotedEffects final : public MessageEffects {
+class RecordedEffects final : public MessageEffects {
 public:
     enum class Kind { None, Sections, Values, Display };
 
