@@ -232,7 +232,7 @@ TEST_F(VelmoraAppTest, SaveScreenCanBeOpenedWhileTheEarlierOneIsStillLeaving) {
     EXPECT_TRUE(saveScreen()->view().widget()->isVisible());
 }
 
-TEST_F(VelmoraAppTest, RedrawGoesOnUnderTheSaveScreen) {
+TEST_F(VelmoraAppTest, RedrawContinuesUnderTheSaveScreen) {
     openThreePanes();
     app.showSaveView();
     runUntilIdle();

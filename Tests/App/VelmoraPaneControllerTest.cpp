@@ -127,7 +127,7 @@ TEST_F(VelmoraPaneControllerTest, RowsAreLaidOutInTheTablesWidth) {
     EXPECT_NEAR(right, width, 1);
 }
 
-TEST_F(VelmoraPaneControllerTest, RowsAreLaidOutAnewWhenTheWindowChangesItsWidth) {
+TEST_F(VelmoraPaneControllerTest, RowsAreLaidOutAgainWhenTheWidthChanges) {
     launchAndConnect();
     show(twoSections());
     QWidget* window = pane(0)->view().widget()->window();

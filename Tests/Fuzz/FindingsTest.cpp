@@ -45,14 +45,14 @@ Data contentOf(const fs::path& path) {
     return Data(std::vector<std::uint8_t>(std::istreambuf_iterator<char>(file), {}));
 }
 
-TEST_P(FuzzTargetTest, BearsWhatFuzzersOnceFound) {
+TEST_P(FuzzTargetTest, AcceptsFormerFindings) {
     for (const fs::path& file : findingsOf(GetParam().name)) {
         SCOPED_TRACE(file.filename().string());
         EXPECT_NO_THROW(target->run(contentOf(file).bytes()));
     }
 }
 
-TEST_P(FuzzTargetTest, BearsItsSeeds) {
+TEST_P(FuzzTargetTest, AcceptsItsSeeds) {
     const FuzzCorpus corpus = GetParam().corpus();
     EXPECT_GE(corpus.seeds.size(), 4u);
     for (std::size_t i = 0; i < corpus.seeds.size(); ++i) {
@@ -61,7 +61,7 @@ TEST_P(FuzzTargetTest, BearsItsSeeds) {
     }
 }
 
-TEST_P(FuzzTargetTest, BearsInputsThatEndAnywhere) {
+TEST_P(FuzzTargetTest, AcceptsTruncatedInputs) {
     const FuzzCorpus corpus = GetParam().corpus();
     const Bytes seed =
         std::min_element(corpus.seeds.begin(), corpus.seeds.end(), [](const Data& a, const Data& b) {
@@ -73,7 +73,7 @@ TEST_P(FuzzTargetTest, BearsInputsThatEndAnywhere) {
     }
 }
 
-TEST_P(FuzzTargetTest, HasTheSameMaterialEveryTime) {
+TEST_P(FuzzTargetTest, HasTheSameCorpusEveryTime) {
     const FuzzCorpus first = GetParam().corpus();
     const FuzzCorpus second = GetParam().corpus();
     EXPECT_EQ(first.seeds, second.seeds);

@@ -52,7 +52,7 @@ TEST(MessageScriptTest, IsAtItsEndWhenEmpty) {
     EXPECT_FALSE(MessageScript({}).next());
 }
 
-TEST(MessageScriptTest, GoesOnBehindAStep) {
+TEST(MessageScriptTest, ContinuesAfterAStep) {
     const Data bytes = hex("03 0100 AA  04  03 0100 BB");
     MessageScript script(bytes.bytes());
     EXPECT_EQ(script.next()->message, hex("AA"));

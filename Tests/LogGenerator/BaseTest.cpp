@@ -19,8 +19,8 @@ constexpr Field oneByte[] = {{"Value", u8At(0), integer("%d")}};
 constexpr Layout entry = layout(1, oneByte);
 constexpr List rows{};
 
-/// A section whose code 1 is a table, whose other codes show the record as a list, and whose records of code 2
-/// have the parts that their first byte says.
+/// A section whose code 1 is a table, whose other codes show the record as a list, and whose records of code
+/// 2 have the parts that their first byte says.
 class Probe final : public Base {
 public:
     Probe(std::string name, const std::vector<std::uint32_t>& codes) : _name(std::move(name)) {
@@ -67,7 +67,7 @@ TEST(BaseTest, RegistersUnderItsNameAndEachCode) {
     EXPECT_THAT(log.lines(), ElementsAre(CapturedLog::Line{LogPriority::Warning, "Array Count: 2"}));
 }
 
-TEST(BaseTest, SubscribersStandInTheOrderOfTheirRegistration) {
+TEST(BaseTest, SubscribersAreInOrderOfRegistration) {
     ClassDictionary classes;
     CodeDictionary codes;
     Probe second("B", {7});

@@ -123,7 +123,7 @@ std::vector<std::uint32_t> codesOf(const Listener& section) {
     return codes;
 }
 
-TEST_P(FramingTest, TellingOfItDoesTheSame) {
+TEST_P(FramingTest, ReportingDoesTheSame) {
     log.clear();
     const Data message = hex(GetParam().bytes);
     RecordedEffects effects;
@@ -143,7 +143,7 @@ TEST_P(FramingTest, TellingOfItDoesTheSame) {
     }
 }
 
-TEST_F(TemplateTest, SectionsOfACodeAreToldWithTheirNodesAsTheyThenStand) {
+TEST_F(TemplateTest, SectionsOfACodeAreReportedWithTheirUpdatedNodes) {
     RecordedEffects effects;
     generator.updateStateTelling(state, record(0x1234, "00 00"), effects);
     EXPECT_EQ(effects.code, 0x1234U);
@@ -168,7 +168,7 @@ TEST_F(TemplateTest, SectionsOfACodeAreToldWithTheirNodesAsTheyThenStand) {
     EXPECT_THAT(effects.members, IsEmpty());
 }
 
-TEST_F(TemplateTest, SectionOfACodeListedTwiceIsToldOnceAndOneWithoutANodeIsNot) {
+TEST_F(TemplateTest, SectionOfADuplicateCodeIsReportedOnceAndOneWithoutANodeIsNot) {
     class OddIndex final : public ClassIndex {
     public:
         OddIndex() {
@@ -355,7 +355,7 @@ TEST_F(TemplateTest, WalkReportsForeignKindsAtAnyDepthAndNothingElse) {
                             CapturedLog::Line{LogPriority::Error, "Received an object of unknown type"}));
 }
 
-TEST_F(TemplateTest, RefreshHandsOverTheRawMessagesAndStartsAnew) {
+TEST_F(TemplateTest, RefreshMovesTheRawMessagesOut) {
     update(hex("AA"));
     update(hex("BB CC"));
     const Value shown = generator.generateLogUsingState(state);
@@ -391,7 +391,7 @@ TEST_F(TemplateTest, StartCommandSplitsTheCodes) {
     EXPECT_THAT(numbers("SetVoxExtraCodes"), UnorderedElementsAre(0, 2));
 }
 
-TEST_F(TemplateTest, NewDecoderGoesOnInTheDisplayOfTheEarlierOne) {
+TEST_F(TemplateTest, NewDecoderContinuesWithTheDisplay) {
     update(record(0xD0E0, "01 02"));
     const Dictionary* shown = &display();
     const auto nextIndex = std::make_shared<ListenerIndex>();

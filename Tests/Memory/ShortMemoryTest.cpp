@@ -156,7 +156,7 @@ TEST(ShortMemoryTest, ARecordThatCannotBeWrittenYetIsWrittenAtTheNextAttempt) {
     EXPECT_GT(failEach(make, write, expectNothing, textsOf(123)), 0u);
 }
 
-TEST(ShortMemoryTest, ACopyIsWholeOrNotMade) {
+TEST(ShortMemoryTest, ACopyIsCompleteOrNotMade) {
     Value copy;
     const auto make = [&copy] {
         const DictionaryRef node = makeDictionary();

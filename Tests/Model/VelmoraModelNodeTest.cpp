@@ -137,7 +137,7 @@ TEST(VelmoraModelNodeTest, SortedDictionaryOrdersByBytesAndShowsWhatFollowsTheSe
     EXPECT_EQ(*root->childNodes()->front()->value(), "first");
 }
 
-TEST(VelmoraModelNodeTest, OfSiblingsWithOneNameTheLaterKeepsThePath) {
+TEST(VelmoraModelNodeTest, TheLastSiblingOfANameHasThePath) {
     PathDictionary byPath;
     const NodeRef root = VelmoraModelNode::makeTreeFromObject(
         dictionary({{"_sorted", ""}, {"2;40", "later"}, {"1;40", "earlier"}}), byPath);

@@ -47,7 +47,7 @@ protected:
     TemporaryDirectory directory;
 };
 
-TEST_F(LinuxAtomicFileTest, TakesItsPlaceInTheEnd) {
+TEST_F(LinuxAtomicFileTest, ReplacesTheTargetOnCommit) {
     AtomicFile draft = create("out", "text");
     EXPECT_EQ(std::filesystem::path(draft.path()).parent_path(), directory.path()) << "on the same disk";
     EXPECT_EQ(names().size(), 1U);
@@ -92,7 +92,7 @@ TEST_F(LinuxAtomicFileTest, HasThePermissionsOfTheFileOrTheUsualOnes) {
     EXPECT_EQ(std::filesystem::status(directory / "new").permissions(), std::filesystem::perms(0604));
 }
 
-TEST_F(LinuxAtomicFileTest, TellsWhereItCannotBe) {
+TEST_F(LinuxAtomicFileTest, ReportsAnUnusableDirectory) {
     const auto draft = AtomicFile::create(directory / "none/out", 0666);
     ASSERT_FALSE(draft);
     EXPECT_EQ(draft.reason(), "cannot be opened for writing: No such file or directory");

@@ -99,7 +99,7 @@ TEST(LinuxFrame, BytesOneByOneGiveTheirFrames) {
     expectTwoFrames(frames);
 }
 
-TEST(LinuxFrame, TheLongestFrameArrivesWhole) {
+TEST(LinuxFrame, TheLongestFrameArrivesCompletely) {
     Frame frame;
     std::vector<std::uint8_t> payload(maximumFramePayload);
     payload.front() = 1;

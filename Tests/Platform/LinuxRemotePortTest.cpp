@@ -102,7 +102,7 @@ TEST_F(LinuxRemotePortTest, AMessageThatIsTooLongCannotBeSent) {
     EXPECT_TRUE(port->isValid());
 }
 
-TEST_F(LinuxRemotePortTest, APeerThatGoesWhileItsAnswerIsAwaitedEndsTheRequest) {
+TEST_F(LinuxRemotePortTest, APeerThatClosesDuringARequestEndsIt) {
     const auto port = connected();
     int invalidated = 0;
     port->setInvalidationCallback([&](RemotePort&) { ++invalidated; });
@@ -145,7 +145,7 @@ TEST_F(LinuxRemotePortTest, TheEventLoopSeesADeadPeer) {
     EXPECT_EQ(seen, raw);
 }
 
-TEST_F(LinuxRemotePortTest, InvalidateCallsBackOnceAndNotWhenTheCallbackIsGone) {
+TEST_F(LinuxRemotePortTest, InvalidateCallsBackOnceAndNotWithoutACallback) {
     auto port = connected();
     int invalidated = 0;
     port->setInvalidationCallback([&](RemotePort& invalid) {

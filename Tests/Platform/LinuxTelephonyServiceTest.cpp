@@ -96,7 +96,7 @@ TEST_F(LinuxTelephonyServiceTest, AnswersWithoutANameGiveNone) {
     EXPECT_EQ(channel(Value(number)), (Outcome{0, 0, ""}));
 }
 
-TEST_F(LinuxTelephonyServiceTest, TheConnectionTellsWhenTheServiceGoes) {
+TEST_F(LinuxTelephonyServiceTest, TheConnectionReportsALostService) {
     _ports.serve("com.velmora.vox.server",
                  [](std::int32_t, const Data&, bool) { return RemotePort::Answer(); });
     int told = 0;

@@ -15,7 +15,7 @@ namespace {
 using testing::ElementsAre;
 using Line = CapturedLog::Line;
 
-TEST(SystemLog, WritesTextAsItStands) {
+TEST(SystemLog, WritesTextUnchanged) {
     CapturedLog log;
     logLine(LogPriority::Error, "100 %s, no format\n");
     logLine(LogPriority::Info, "");

@@ -29,7 +29,7 @@ constexpr std::size_t smallChunk = 8192;
 
 class ChunkedInputReads : public testing::TestWithParam<std::size_t> {};
 
-TEST_P(ChunkedInputReads, keepPartsGoodWhileTheInputMovesOn) {
+TEST_P(ChunkedInputReads, keepPartsValidWhileTheInputAdvances) {
     const Data content = counting(20'000);
     ChunkedInput input(std::make_unique<MemorySource>(content, GetParam()), smallChunk);
     std::vector<Data> parts;
@@ -48,7 +48,7 @@ TEST_P(ChunkedInputReads, keepPartsGoodWhileTheInputMovesOn) {
 
 INSTANTIATE_TEST_SUITE_P(Sizes, ChunkedInputReads, testing::Values(1, 5, 4096, SIZE_MAX));
 
-TEST(ChunkedInput, usesAChunkAgainThatNobodyHolds) {
+TEST(ChunkedInput, reusesAnUnreferencedChunk) {
     ChunkedInput input(std::make_unique<MemorySource>(counting(20'000)), smallChunk);
     ASSERT_TRUE(input.ensure(4));
     const std::uint8_t* const chunk = input.available().data();
@@ -84,7 +84,7 @@ TEST(ChunkedInput, growsForALongLookAheadAndShrinksAfterIt) {
     EXPECT_EQ(input.offset(), 400'000U);
 }
 
-TEST(ChunkedInput, tellsAReadErrorWithItsOffset) {
+TEST(ChunkedInput, reportsAReadErrorWithItsOffset) {
     ChunkedInput input(std::make_unique<MemorySource>(counting(100), SIZE_MAX, 10));
     ASSERT_TRUE(input.ensure(4));
     input.skip(4);

@@ -106,7 +106,7 @@ TEST_P(DLFRecords, comeAsTheyArrived) {
     EXPECT_EQ(out.failure, "");
 }
 
-TEST_P(DLFRecords, comeInWhateverPiecesTheyAreRead) {
+TEST_P(DLFRecords, areTheSameForAnyReadSize) {
     const Data file = joined(versionReport(), hex(GetParam().records));
     const ReadOut whole = readAnyForm(file);
     for (const std::size_t piece : {1U, 2U, 3U, 7U, 13U})

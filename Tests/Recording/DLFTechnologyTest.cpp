@@ -41,7 +41,7 @@ Data recordsOf(std::initializer_list<std::uint16_t> codes, int rounds) {
     return Data(std::move(bytes));
 }
 
-TEST(DLFTechnology, tellsTheTechnologyFromTheLogCodes) {
+TEST(DLFTechnology, recognisesTheTechnologyByItsLogCodes) {
     struct Told {
         const char* name;
         Data records;

@@ -59,7 +59,7 @@ TEST_F(DLFWriterTest, beginsWithTheVersionReport) {
     EXPECT_EQ(written(0), hexText(wanted.bytes()));
 }
 
-TEST_F(DLFWriterTest, takesTheTypeByteOfRecordsThatTellItByTheirCode) {
+TEST_F(DLFWriterTest, dropsTypeBytesThatFollowFromTheCode) {
     struct Case {
         const char* name;
         const char* message;
@@ -85,7 +85,7 @@ TEST_F(DLFWriterTest, takesTheTypeByteOfRecordsThatTellItByTheirCode) {
     }
 }
 
-TEST_F(DLFWriterTest, refusesWhatCouldNotBeFollowed) {
+TEST_F(DLFWriterTest, refusesMessagesThatHideTheNextRecord) {
     struct Case {
         const char* message;
         const char* reason;
@@ -137,7 +137,7 @@ TEST_F(DLFWriterTest, whatItWritesIsReadAgain) {
     EXPECT_THAT(out.losses, IsEmpty());
 }
 
-TEST_F(DLFWriterTest, tellsAFailureFromThenOn) {
+TEST_F(DLFWriterTest, repeatsAFailure) {
     _medium.room = 170;
     const auto writer = make();
     EXPECT_TRUE(writer->append(record(0x512C, "05000100").bytes()));
@@ -154,7 +154,7 @@ TEST_F(DLFWriterTest, tellsAFailureFromThenOn) {
     EXPECT_EQ(none.reason(), "cannot write drive.dlf: No space left on device");
 }
 
-TEST_F(DLFWriterTest, takesNoMessageBehindAFailure) {
+TEST_F(DLFWriterTest, acceptsNoMessageAfterAFailure) {
     _medium.room = 161;
     const auto writer = make();
     // What is gathered goes out from 64 KiB on: two records of 40012 bytes.
@@ -169,7 +169,7 @@ TEST_F(DLFWriterTest, takesNoMessageBehindAFailure) {
     EXPECT_EQ(_medium.content.size(), 161u);
 }
 
-TEST_F(DLFWriterTest, tellsWhatTheMediumSaysInTheEnd) {
+TEST_F(DLFWriterTest, reportsAFailedFinalSync) {
     struct Case {
         const char* name;
         bool isRegular;

@@ -72,7 +72,7 @@ TEST_F(DescriptorFileTest, PipeCannotBeCut) {
     ::close(ends[0]);
 }
 
-TEST_F(DescriptorFileTest, DescriptorOfSomebodyElseStaysOpen) {
+TEST_F(DescriptorFileTest, ForeignDescriptorStaysOpen) {
     const int descriptor = open(O_WRONLY | O_CREAT);
     EXPECT_EQ(DescriptorFile(descriptor, false).close(), 0);
     EXPECT_EQ(::close(descriptor), 0);
@@ -114,7 +114,7 @@ TEST_F(DescriptorFileTest, SyncIsWaitedForElsewhere) {
     EXPECT_EQ(file.close(), 0) << "closing waits for it";
 }
 
-TEST_F(DescriptorFileTest, SyncOfWhatHasNoMediumSaysSo) {
+TEST_F(DescriptorFileTest, SyncOfAPipeIsAnError) {
     int ends[2];
     ASSERT_EQ(::pipe2(ends, O_CLOEXEC), 0);
     DescriptorFile file(ends[1], true);

@@ -41,7 +41,7 @@ protected:
     TemporaryDirectory _directory;
 };
 
-TEST_F(OpenMessages, opensARecordingWhateverItsName) {
+TEST_F(OpenMessages, opensARecordingOfAnyName) {
     const std::string path =
         fileOf(PcapngFile().head().message(7, hex("0102").bytes()).data(), "snapshot.velmora");
     auto reader = openMessages(path);
@@ -80,7 +80,7 @@ TEST_F(OpenMessages, readsStandardInputThroughAPipe) {
     ::close(standardInput);
 }
 
-TEST_F(OpenMessages, givesMessagesOfAPipeAsSoonAsTheyAreWhole) {
+TEST_F(OpenMessages, returnsMessagesOfAPipeOnceComplete) {
     int ends[2];
     ASSERT_EQ(::pipe(ends), 0);
     auto writer = PcapngWriter::adopt(ends[1], "pipe", "Ostrel_LTE");
@@ -124,7 +124,7 @@ TEST_F(OpenMessages, waitsWherePipesDoNotBlock) {
     EXPECT_EQ((*reader)->lossTotals().losses, 0U);
 }
 
-TEST_F(OpenMessages, tellsTheFormByWhatTheFileBeginsWith) {
+TEST_F(OpenMessages, recognisesTheFormByItsFirstBytes) {
     const Data list = snapshotFile({historyEntry(record(0x512C, "05000100"), "2026-11-16 05:00:02 +0000")});
     const Data document = hex("EFBBBF 0A20"); // a mark of UTF-8, and white space
     const auto formOf = [this](const Data& content) {

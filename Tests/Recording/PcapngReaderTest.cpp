@@ -37,7 +37,7 @@ TEST(PcapngReader, readsBigEndianRecordings) {
     EXPECT_EQ(out.technology, "Ostrel_GSM");
 }
 
-TEST(PcapngReader, knowsTheTechnologyBeforeTheFirstMessage) {
+TEST(PcapngReader, hasTheTechnologyBeforeTheFirstMessage) {
     auto reader = PcapngReader::open(
         ChunkedInput(std::make_unique<MemorySource>(PcapngFile().head().message(1, {}).data())));
     ASSERT_TRUE(reader);
@@ -58,7 +58,7 @@ TEST(PcapngReader, leavesTheTechnologyOpenWhereNoInterfaceIsNamed) {
     EXPECT_THAT(out.losses, IsEmpty());
 }
 
-TEST(PcapngReader, takesTheFirstTechnologyNamedAndLosesTheOthers) {
+TEST(PcapngReader, takesTheFirstTechnologyAndReportsTheOthersAsLosses) {
     PcapngFile file;
     file.section().messageInterface("").messageInterface("Ostrel_LTE").messageInterface("Ostrel_GSM");
     file.messageInterface("Ostrel_LTE");
@@ -143,7 +143,7 @@ TEST(PcapngReader, opensNoFileThatIsNotThere) {
     EXPECT_EQ(none.reason(), "cannot open: No such file or directory");
 }
 
-TEST(PcapngReader, tellsAReadErrorApartFromTheEnd) {
+TEST(PcapngReader, distinguishesAReadErrorFromTheEnd) {
     const Data file = PcapngFile().head().message(1, hex("AA").bytes()).message(2, hex("BB").bytes()).data();
     const ReadOut between = readOut(file, SIZE_MAX, 112);
     EXPECT_THAT(between.messages, ElementsAre("1 at 76, 1 ns: AA"));

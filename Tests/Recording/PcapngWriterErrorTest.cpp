@@ -16,7 +16,7 @@ using testing::ElementsAre;
 
 using PcapngWriterErrorTest = RecordingTroubleFixture;
 
-TEST_F(PcapngWriterErrorTest, FullDiskKeepsWholeBlocksAndGoesOnWithoutAGap) {
+TEST_F(PcapngWriterErrorTest, FullDiskKeepsCompleteBlocksAndContinuesWithoutAGap) {
     start();
     ASSERT_TRUE(append(1));
     ASSERT_TRUE(writer->flush());
@@ -51,7 +51,7 @@ TEST_F(PcapngWriterErrorTest, FullDiskKeepsWholeBlocksAndGoesOnWithoutAGap) {
     EXPECT_THAT(numbers(), ElementsAre(1, 2, 3, 4, 5, 6));
 }
 
-TEST_F(PcapngWriterErrorTest, EveryRoomLeavesWholeBlocks) {
+TEST_F(PcapngWriterErrorTest, AnyDiskSpaceLeavesCompleteBlocks) {
     for (std::size_t room = 0; room <= headSize + 3 * blockSize; ++room) {
         medium = FakeOutputFile();
         medium.room = room;
@@ -72,7 +72,7 @@ TEST_F(PcapngWriterErrorTest, EveryRoomLeavesWholeBlocks) {
     }
 }
 
-TEST_F(PcapngWriterErrorTest, ErrorsThatMayPass) {
+TEST_F(PcapngWriterErrorTest, TemporaryErrors) {
     for (const int error : {ENOSPC, EDQUOT, EFBIG, EIO, EROFS}) {
         medium = FakeOutputFile();
         start();
@@ -84,7 +84,7 @@ TEST_F(PcapngWriterErrorTest, ErrorsThatMayPass) {
     }
 }
 
-TEST_F(PcapngWriterErrorTest, OtherErrorsAreForGood) {
+TEST_F(PcapngWriterErrorTest, OtherErrorsArePermanent) {
     start();
     ASSERT_TRUE(append(1));
     medium.room = 0;
@@ -101,7 +101,7 @@ TEST_F(PcapngWriterErrorTest, OtherErrorsAreForGood) {
     EXPECT_THAT(numbers(), ElementsAre());
 }
 
-TEST_F(PcapngWriterErrorTest, WhatCannotBeTakenBackIsForGood) {
+TEST_F(PcapngWriterErrorTest, UntruncatableOutputFailsPermanently) {
     medium.isRegular = false;
     start();
     ASSERT_TRUE(append(1));
@@ -114,7 +114,7 @@ TEST_F(PcapngWriterErrorTest, WhatCannotBeTakenBackIsForGood) {
     EXPECT_EQ(medium.content.size(), headSize + 5);
 }
 
-TEST_F(PcapngWriterErrorTest, NothingIsWrittenBehindAPartThatCannotBeTakenBackYet) {
+TEST_F(PcapngWriterErrorTest, NothingIsWrittenAfterAPartialBlockThatCannotBeTruncatedYet) {
     start();
     ASSERT_TRUE(append(1));
     medium.room = headSize + 5;
@@ -129,7 +129,7 @@ TEST_F(PcapngWriterErrorTest, NothingIsWrittenBehindAPartThatCannotBeTakenBackYe
     EXPECT_THAT(numbers(), ElementsAre(1));
 }
 
-TEST_F(PcapngWriterErrorTest, HeadMayWaitToo) {
+TEST_F(PcapngWriterErrorTest, HeaderMayBeQueuedToo) {
     medium.room = 60;
     start();
     EXPECT_TRUE(writer->hasTemporaryError());
@@ -140,7 +140,7 @@ TEST_F(PcapngWriterErrorTest, HeadMayWaitToo) {
     EXPECT_THAT(numbers(), ElementsAre(1));
 }
 
-TEST_F(PcapngWriterErrorTest, UnsavedMessagesAreKnownInTheEnd) {
+TEST_F(PcapngWriterErrorTest, UnsavedMessagesAreCountedAtTheEnd) {
     start();
     medium.room = headSize;
     ASSERT_TRUE(append(1));
@@ -179,7 +179,7 @@ TEST_F(PcapngWriterErrorTest, QueueIsBoundedAndItsGapIsOne) {
     EXPECT_THAT(numbers(), ElementsAre(1, 2, 2, 2, 2, 2, 2, 2, 2, 2, 2, 2, 2, 2, 2, 2, 4));
 }
 
-TEST_F(PcapngWriterErrorTest, ShortWritesAreNoTrouble) {
+TEST_F(PcapngWriterErrorTest, ShortWritesAreNoError) {
     medium.longestWrite = 7;
     start();
     ASSERT_TRUE(append(1));
@@ -188,7 +188,7 @@ TEST_F(PcapngWriterErrorTest, ShortWritesAreNoTrouble) {
     EXPECT_THAT(numbers(), ElementsAre(1, 2));
 }
 
-TEST_F(PcapngWriterErrorTest, LongMessageIsKeptBehindTroubleThatMayPassAndNotBehindOther) {
+TEST_F(PcapngWriterErrorTest, LongMessageIsQueuedAfterATemporaryErrorOnly) {
     // Above 128 KiB what has been gathered goes out ahead of the message.
     const std::vector<std::uint8_t> large(150'000, 2);
     start();

@@ -130,7 +130,7 @@ TEST_F(PcapngWriterFiles, getEveryMessageByTheEndOfTheWriter) {
     EXPECT_EQ(content().size(), 2 * (100U + 36U));
 }
 
-TEST_F(PcapngWriterFiles, growByWholeBlocks) {
+TEST_F(PcapngWriterFiles, growByCompleteBlocks) {
     const auto writer = create();
     const std::vector<std::uint8_t> message(1000, 0x11);
     std::uintmax_t sizes = 0;
@@ -206,19 +206,19 @@ TEST_F(PcapngWriterFiles, giveRandomMessagesBack) {
     EXPECT_EQ((*reader)->lossTotals().losses, 0U);
 }
 
-TEST(PcapngWriter, tellsThatTheFileCannotBeCreated) {
+TEST(PcapngWriter, reportsAnUncreatableFile) {
     const auto writer = PcapngWriter::create("/nonexistent/recording.pcapng", "Ostrel_GSM");
     ASSERT_FALSE(writer);
     EXPECT_EQ(writer.reason(), "cannot create /nonexistent/recording.pcapng: No such file or directory");
 }
 
-TEST(PcapngWriter, tellsThatTheMediumIsFull) {
+TEST(PcapngWriter, reportsAFullDisk) {
     const auto writer = PcapngWriter::create("/dev/full", "Ostrel_GSM");
     ASSERT_FALSE(writer);
     EXPECT_EQ(writer.reason(), "cannot write /dev/full: No space left on device");
 }
 
-TEST(PcapngWriter, tellsAWriteErrorEverAfter) {
+TEST(PcapngWriter, repeatsAWriteError) {
     // The disk becomes full once the header is written.
     TemporaryDirectory directory;
     const std::string path = directory / "recording";
@@ -250,7 +250,7 @@ TEST(PcapngWriter, tellsAWriteErrorEverAfter) {
     EXPECT_EQ(status.st_size, 100);
 }
 
-TEST(PcapngWriter, tellsAWriteErrorOfALongMessage) {
+TEST(PcapngWriter, reportsAWriteErrorOfALongMessage) {
     int ends[2];
     ASSERT_EQ(::pipe(ends), 0);
     auto* const earlier = std::signal(SIGPIPE, SIG_IGN);

@@ -43,7 +43,7 @@ std::vector<std::string> without(std::size_t lost) {
     return texts;
 }
 
-TEST(RecordingDamage, cutOffAtAnyByteOfTheLastTwoBlocksLosesOnlyWhatIsCut) {
+TEST(RecordingDamage, truncationInTheLastTwoBlocksLosesOnlyTheTruncatedOne) {
     const Data whole = fourMessages().data();
     ASSERT_EQ(whole.size(), fourSize);
     for (std::size_t size = 156; size < fourSize; ++size) {

@@ -34,7 +34,7 @@ TEST_F(RecordingSyncTest, SyncIsStartedForWhatIsNewAndOneAtATime) {
     EXPECT_EQ(medium.syncsWaitedFor, 1U);
 }
 
-TEST_F(RecordingSyncTest, WhatTheMediumLostIsWrittenOnceMore) {
+TEST_F(RecordingSyncTest, DataOfAFailedSyncIsRewritten) {
     start();
     ASSERT_TRUE(append(1));
     ASSERT_TRUE(writer->sync());
@@ -56,7 +56,7 @@ TEST_F(RecordingSyncTest, WhatTheMediumLostIsWrittenOnceMore) {
     EXPECT_THAT(numbers(), ElementsAre(1, 2, 3));
 }
 
-TEST_F(RecordingSyncTest, MediumGetsASecondTryInTheEnd) {
+TEST_F(RecordingSyncTest, FinalSyncIsRetried) {
     start();
     ASSERT_TRUE(writer->sync());
     medium.syncOutcome = 0;
@@ -68,7 +68,7 @@ TEST_F(RecordingSyncTest, MediumGetsASecondTryInTheEnd) {
     EXPECT_THAT(numbers(), ElementsAre(1));
 }
 
-TEST_F(RecordingSyncTest, MediumThatFailsInTheEndIsToldWhereNothingWasKept) {
+TEST_F(RecordingSyncTest, FailedFinalSyncIsReportedWhereNothingCanBeRewritten) {
     start();
     ASSERT_TRUE(append(1));
     medium.syncError = ENOSPC;
@@ -76,7 +76,7 @@ TEST_F(RecordingSyncTest, MediumThatFailsInTheEndIsToldWhereNothingWasKept) {
     EXPECT_EQ(medium.syncsWaitedFor, 1U);
 }
 
-TEST_F(RecordingSyncTest, FileThatIsNotClosedIsToldUnlessThereWasTroubleBefore) {
+TEST_F(RecordingSyncTest, FailedCloseIsReportedUnlessAnErrorCameFirst) {
     start();
     ASSERT_TRUE(append(1));
     medium.closeError = EIO;
@@ -91,7 +91,7 @@ TEST_F(RecordingSyncTest, FileThatIsNotClosedIsToldUnlessThereWasTroubleBefore) 
     EXPECT_EQ(reasonOf(writer->close()), full);
 }
 
-TEST_F(RecordingSyncTest, FileSystemWithoutAMediumIsNoTrouble) {
+TEST_F(RecordingSyncTest, FileSystemWithoutSyncIsNoError) {
     start();
     ASSERT_TRUE(append(1));
     medium.syncError = EINVAL;
@@ -99,7 +99,7 @@ TEST_F(RecordingSyncTest, FileSystemWithoutAMediumIsNoTrouble) {
     EXPECT_THAT(numbers(), ElementsAre(1));
 }
 
-TEST_F(RecordingSyncTest, KeepsNoMoreThanItsShareForASlowMedium) {
+TEST_F(RecordingSyncTest, BoundsUnsyncedDataOnSlowStorage) {
     start();
     ASSERT_TRUE(writer->sync());
     // The sync does not finish while 9 MiB are written, one more than are kept.

@@ -52,7 +52,7 @@ TEST(SnapshotReader, givesTheMessagesOfEachRefresh) {
     }
 }
 
-TEST(SnapshotReader, splitsRawMaterialAsItCame) {
+TEST(SnapshotReader, splitsRawMessagesUnchanged) {
     // With prefixes, a wrong type, and records of the extra stream.
     const Data raw = hex(R"(02 0F00 3271 0000000000000000 010000
                             01 1000 2C51 0000000000000000 05000100
@@ -200,7 +200,7 @@ Value dlfItem(const Data& log) {
     return item;
 }
 
-TEST(SnapshotReader, turnsToTheLogWhereNoEntryHasRawMaterial) {
+TEST(SnapshotReader, fallsBackToTheLogWithoutRawMessages) {
     const Data log = joined(versionReport(), bareRecord(0x512C, "05000100", stampAfter(0)),
                             stampedRecord(0x7132, "010000", stampAfter(800)), hex("DEAD"));
     const ReadOut out = readAnyForm(snapshotFile({makeDictionary(), dlfItem(log)}));

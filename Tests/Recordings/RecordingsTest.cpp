@@ -72,9 +72,7 @@ public:
     Screens& operator=(const Screens&) = delete;
 
     void decode(const Data& message) { _decoder->updateState(_state, message); }
-    void look() {
-        collectShown(_decoder->display(_state), "", _shown);
-    }
+    void look() { collectShown(_decoder->display(_state), "", _shown); }
     [[nodiscard]] const std::set<std::string>& shown() const { return _shown; }
 
 private:
@@ -168,7 +166,7 @@ TEST_P(Recordings, decodeAsTheReferenceSays) {
     expectReference("decode --format text", std::string(GetParam().scenario), ".decode.txt");
 }
 
-TEST_P(Recordings, areToldOfAsTheReferenceSays) {
+TEST_P(Recordings, haveTheInfoOfTheReference) {
     expectReference("info", std::string(GetParam().scenario), ".info.txt");
 }
 

@@ -113,7 +113,7 @@ struct ListRow {
     const char* expert;
 };
 
-TEST(DissectorList, showsEachKindOfValueAndTellsWhatIsWrong) {
+TEST(DissectorList, showsEachKindOfValueAndMarksErrors) {
     NEEDS_PROGRAM("tshark");
     const ListRow rows[] = {
         {"false", listOf("08"), "false", ""},

@@ -18,7 +18,7 @@ using ::testing::IsEmpty;
 
 using LogServerClientsTest = LogServerTest;
 
-TEST_F(LogServerClientsTest, closesAChannelWhoseClientHasGone) {
+TEST_F(LogServerClientsTest, closesTheChannelOfAClosedClient) {
     listen();
     const std::string channel = createChannel("app");
     stream(channel);
@@ -42,7 +42,7 @@ TEST_F(LogServerClientsTest, closesAChannelWhosePortWasClosed) {
     EXPECT_EQ(source.stops, 1);
 }
 
-TEST_F(LogServerClientsTest, aClientThatGoesTakesNobodyAlong) {
+TEST_F(LogServerClientsTest, aClosedClientDoesNotAffectOthers) {
     listen();
     stream(createChannel("one"));
     stream(createChannel("two"));
@@ -115,7 +115,7 @@ TEST_F(LogServerClientsTest, statesOfAnEarlierRunAreForgotten) {
     EXPECT_EQ(source.starts, 2);
 }
 
-TEST_F(LogServerClientsTest, aNewRunBeginsEvenIfTheLastClientHasJustGone) {
+TEST_F(LogServerClientsTest, aNewRunStartsRightAfterTheLastClientHasClosed) {
     listen();
     stream(createChannel("one"));
     ports.sever("one"); // what follows comes before the queue has had its turn
@@ -164,7 +164,7 @@ TEST_F(LogServerClientsTest, stopClosesEverything) {
     EXPECT_EQ(source.stops, 1);
 }
 
-TEST_F(LogServerClientsTest, tellsWhenItsPortIsLost) {
+TEST_F(LogServerClientsTest, reportsALostPort) {
     listen();
     ASSERT_TRUE(ports.closeLocal(serverName));
     EXPECT_TRUE(lost);

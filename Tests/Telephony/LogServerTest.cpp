@@ -88,7 +88,7 @@ TEST_F(LogServerTest, otherMessageIdsAreIgnored) {
     EXPECT_THAT(errors(), IsEmpty());
 }
 
-TEST_F(LogServerTest, tellsTheTechnology) {
+TEST_F(LogServerTest, reportsTheTechnology) {
     listen();
     const std::string channel = createChannel("app");
     EXPECT_EQ(request(channel, plist({{"GetTechnology", "GetTechnology"}})),
@@ -96,7 +96,7 @@ TEST_F(LogServerTest, tellsTheTechnology) {
     EXPECT_EQ(source.starts, 0);
 }
 
-TEST_F(LogServerTest, tellsNoTechnologyWhileTheSourceHasNone) {
+TEST_F(LogServerTest, reportsNoTechnologyWhileTheSourceHasNone) {
     listen();
     source.spoken = {};
     const std::string channel = createChannel("app");
@@ -166,7 +166,7 @@ TEST_F(LogServerTest, streamsWhatTheFilterPasses) {
     EXPECT_THAT(sentTo("app"), ElementsAre(wanted, malformed, sim));
 }
 
-TEST_F(LogServerTest, aNewStartCommandChangesTheFilterAndStartsNothingAnew) {
+TEST_F(LogServerTest, aNewStartCommandChangesTheFilterWithoutARestart) {
     listen();
     const std::string channel = createChannel("app");
     stream(channel);

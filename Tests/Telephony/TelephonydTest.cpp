@@ -71,7 +71,7 @@ TEST_F(TelephonydTest, streamsTheScenarioAndStopsCleanly) {
     }
 }
 
-TEST_F(TelephonydTest, tellsTheServiceManagerWhenItIsReadyAndWhenItStops) {
+TEST_F(TelephonydTest, notifiesTheServiceManagerOfReadinessAndStop) {
     NotifySocket manager((directory / "notify").string());
     ::setenv("NOTIFY_SOCKET", manager.address().c_str(), 1);
     const auto service = start({"--source", "scenario:gsm"});
@@ -165,7 +165,7 @@ TEST_F(TelephonydTest, replaysAFileAsFastAsItsClientTakesItAndLosesNothing) {
     })) << service->standardError();
 }
 
-TEST_F(TelephonydTest, replaysALogThatDoesNotTellItsTechnology) {
+TEST_F(TelephonydTest, replaysALogWithoutATechnology) {
     // A code without subscriber, in a log of bare records.
     const Data message = recordOf(0x1375, {});
     std::vector<std::uint8_t> content;
@@ -191,7 +191,7 @@ TEST_F(TelephonydTest, replaysALogThatDoesNotTellItsTechnology) {
     EXPECT_THAT(client.messages, ElementsAre(message, message, message));
 }
 
-TEST_F(TelephonydTest, aSecondServiceIsToldSo) {
+TEST_F(TelephonydTest, aSecondServiceIsRefused) {
     const auto service = start({"--source", "scenario:gsm"});
     ASSERT_TRUE(eventually([&] { return !serviceSockets().empty(); }));
     const auto second = start({"--source", "scenario:gsm"});
@@ -203,7 +203,7 @@ TEST_F(TelephonydTest, aSecondServiceIsToldSo) {
     EXPECT_TRUE(client.connect()) << "the first serves on";
 }
 
-TEST_F(TelephonydTest, badCommandLinesAndInputsAreToldApart) {
+TEST_F(TelephonydTest, badCommandLinesAndInputsHaveDifferentStatus) {
     struct Case {
         Arguments arguments;
         int status;

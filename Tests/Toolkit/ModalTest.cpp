@@ -144,7 +144,7 @@ TEST_F(ModalTest, AStackBelowMayChangeWithoutTakingTheKeyboard) {
     EXPECT_TRUE(stage.stack->topViewController()->view().isFirstResponder());
 }
 
-TEST_F(ModalTest, AnAnimatedSheetComesFromBelowAndGoesThere) {
+TEST_F(ModalTest, AnAnimatedSheetSlidesInAndOutAtTheBottom) {
     const auto form = present(true);
     EXPECT_THAT(form->log, ElementsAre("will appear animated"));
     const auto top = [&] { return form->view().widget()->mapTo(stage.window.widget(), QPoint()).y(); };

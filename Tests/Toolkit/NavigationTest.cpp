@@ -125,7 +125,7 @@ TEST_F(NavigationTest, TheBackButtonAndTheKeysGoBack) {
     EXPECT_THAT(titles(), ElementsAre("root"));
 }
 
-TEST_F(NavigationTest, EnterOnABackButtonThatHasTheKeyboardGoesBack) {
+TEST_F(NavigationTest, EnterOnAFocusedBackButtonPops) {
     stage.show();
     push("one");
     QWidget* const back = find(stage.window, "velmora.back");

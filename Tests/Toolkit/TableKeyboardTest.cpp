@@ -142,7 +142,7 @@ TEST_F(TableKeyboardTest, ADoubleClickIsOneTap) {
     EXPECT_EQ(pane.chosen.size(), 1U);
 }
 
-TEST_F(TableKeyboardTest, TabGoesToTheToolbarAndBack) {
+TEST_F(TableKeyboardTest, TabMovesToTheToolbarAndBack) {
     EXPECT_EQ(stage.window.widget()->focusWidget(), table().widget());
     press(Qt::Key_Tab);
     press(Qt::Key_Tab);

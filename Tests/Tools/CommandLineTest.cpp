@@ -62,7 +62,7 @@ TEST(CommandLineTest, WithoutOptionsLogLinesOfErrorsGoToStandardError) {
     EXPECT_EQ(line.logLevel, 3);
 }
 
-TEST(CommandLineTest, LogOptionsStandBeforeOrAfterTheCommand) {
+TEST(CommandLineTest, LogOptionsMayPrecedeOrFollowTheCommand) {
     for (const auto& arguments :
          {std::vector<const char*>{"--log", "syslog", "--log-level", "6", "watch", "--once"},
           std::vector<const char*>{"watch", "--log", "syslog", "--once", "--log-level=6"}}) {
@@ -112,7 +112,7 @@ TEST(CommandLineTest, InfoTakesAFileAndATechnology) {
     EXPECT_EQ(info->technology, "Ostrel_LTE");
 }
 
-TEST(CommandLineTest, UsageErrorsSayWhatWasGivenAndWhatIsWanted) {
+TEST(CommandLineTest, UsageErrorsGiveTheFoundAndTheExpectedValue) {
     struct Case {
         std::vector<const char*> arguments;
         const char* message;
@@ -190,7 +190,7 @@ TEST_F(CommandLineProgramTest, UsageErrorEndsWithTwo) {
     EXPECT_EQ(process.errors(), "velmora-log: FILE is required\nvelmora-log --help tells more\n");
 }
 
-TEST_F(CommandLineProgramTest, HelpToAFullDiskIsTold) {
+TEST_F(CommandLineProgramTest, HelpToAFullDiskIsReported) {
     ToolProcess::Setup setup = tool({"--help"});
     setup.outputFile = "/dev/full";
     ToolProcess process(setup);

@@ -13,7 +13,7 @@ namespace {
 
 using testing::ElementsAre;
 
-TEST(DeferredLogTest, PassesLinesOnInTheEndAtTheLogsOwnLevel) {
+TEST(DeferredLogTest, WritesDeferredLinesAtTheLogsOwnLevel) {
     CapturedLog log(LogPriority::Error);
     {
         DeferredLog held;
@@ -29,7 +29,7 @@ TEST(DeferredLogTest, PassesLinesOnInTheEndAtTheLogsOwnLevel) {
     EXPECT_THAT(log.textsAt(LogPriority::Error), ElementsAre("first", "second", "third"));
 }
 
-TEST(DeferredLogTest, KeepsTheLatestLinesAndTellsHowManyAreMissing) {
+TEST(DeferredLogTest, KeepsTheLatestLinesAndCountsTheOthers) {
     CapturedLog log;
     {
         DeferredLog held;
@@ -43,7 +43,7 @@ TEST(DeferredLogTest, KeepsTheLatestLinesAndTellsHowManyAreMissing) {
     EXPECT_EQ(lines.back(), "line 202");
 }
 
-TEST(DeferredLogTest, HoldsTheConsoleTooAndTellsNothingTwice) {
+TEST(DeferredLogTest, DefersTheConsoleTooAndRepeatsNothing) {
     testing::internal::CaptureStderr();
     std::FILE* earlier = redirectConsole(stderr);
     {

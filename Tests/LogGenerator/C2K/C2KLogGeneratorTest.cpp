@@ -113,7 +113,7 @@ TEST_F(C2KLogGeneratorTest, LookupNamesLabelAndScreenOfEveryValueKey) {
     EXPECT_EQ((*targets[1].asDictionary())["dict"].asDictionary(), root["EV-DO"].asDictionary());
 }
 
-TEST_F(C2KLogGeneratorTest, ValuesStandUnderAllTheirLabelsAndStay) {
+TEST_F(C2KLogGeneratorTest, ValuesAreShownUnderAllTheirLabelsAndPersist) {
     EXPECT_THAT(update(noFingers()),
                 ElementsAre(CapturedLog::Line{LogPriority::Warning, "Processing the template"},
                             CapturedLog::Line{LogPriority::Warning, "Processing the template"}));
@@ -184,7 +184,7 @@ TEST_F(C2KLogGeneratorTest, Framing) {
     }
 }
 
-TEST_F(C2KLogGeneratorTest, ValuesThatAMessagePublishesAreTold) {
+TEST_F(C2KLogGeneratorTest, PublishedValuesAreReported) {
     build();
     const CapturedLog log;
     RecordedEffects effects;
@@ -284,7 +284,7 @@ TEST_F(C2KLogGeneratorTest, SaveContentsEndInTheLog) {
     EXPECT_EQ(dlf["DLF"].asData()->from(161), noFingers().from(1));
 }
 
-TEST_F(C2KLogGeneratorTest, NewDecoderGoesOnInTheStateOfTheEarlierOne) {
+TEST_F(C2KLogGeneratorTest, NewDecoderContinuesWithTheState) {
     const auto rateRecord = [](std::uint32_t sequence, std::uint32_t packets) {
         return recordWith(0x1192, 241, {{13, 4, sequence}, {17, 4, packets}});
     };
@@ -384,7 +384,7 @@ TEST(C2KProcessTemplateTest, CopiesMarkersSkipsForeignValuesAndNests) {
     EXPECT_EQ(log.lines(), LogLines(4, {LogPriority::Warning, "Processing the template"}));
 }
 
-TEST(C2KProcessTemplateTest, EmptyTemplateSaysSoToo) {
+TEST(C2KProcessTemplateTest, AnEmptyTemplateIsReportedToo) {
     const DictionaryRef display = makeDictionary();
     Dictionary lookup;
     const CapturedLog log;

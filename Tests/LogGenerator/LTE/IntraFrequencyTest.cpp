@@ -105,7 +105,7 @@ TEST(ConnectedModeMeasurementMisc, ReadsUnsigned16Bits) {
     EXPECT_EQ(section.text("Subframe Number"), "65534");
 }
 
-TEST(MeasuredNeighborCells, EndsWithTheLastNeighbourThatIsWhole) {
+TEST(MeasuredNeighborCells, EndsWithTheLastCompleteNeighbour) {
     expectPrefixes(inArray<MeasuredNeighborCells>, record(0xB179, twoAndThree), 29, "Measured Neighbor Cells",
                    [](std::size_t length) { return list(neighbours, (length - 29) / 6); });
     SectionHarness section = inArray<MeasuredNeighborCells>();
@@ -169,7 +169,7 @@ TEST(DetectedCells, FollowTheAnnouncedNeighbours) {
     EXPECT_THAT(section.errors(), ElementsAre("Record 0xB179: 0 of 3 entries"));
 }
 
-TEST(DetectedCells, EndWithTheLastThatIsWhole) {
+TEST(DetectedCells, EndWithTheLastCompleteCell) {
     SectionHarness section = inArray<DetectedCells>();
     section.update(withByte(record(0xB179, twoAndThree), 28, 4));
     EXPECT_EQ(section.node(), list(detected, 3));

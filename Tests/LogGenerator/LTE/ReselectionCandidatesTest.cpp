@@ -180,7 +180,7 @@ struct EndCase {
     std::size_t shown;
 };
 
-TEST(ReselectionCandidatesList, EndsBeforeTheFirstCandidateThatIsNotWhole) {
+TEST(ReselectionCandidatesList, EndsBeforeTheFirstIncompleteCandidate) {
     const EndCase cases[] = {
         {"nothing", 1, "", 0},
         {"a header less a byte", 1, "01 00 05", 0},

@@ -140,7 +140,7 @@ TEST(ActiveSet, OnlySetTypeZeroIsActive) {
     }
 }
 
-TEST(ActiveSet, EndsWithTheLastCellWhoseMeasurementIsWhole) {
+TEST(ActiveSet, EndsWithTheLastCellWithACompleteMeasurement) {
     const Cell active{300, 0, {417647, 0, 0}};
     const Data two = searcher(-1000, {active, active});
     ASSERT_EQ(two.size(), 16u + 30 + 88);

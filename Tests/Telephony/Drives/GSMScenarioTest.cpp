@@ -94,7 +94,7 @@ TEST(GSMScenarioTest, aboutTwentyMessagesComeASecond) {
     expectRate(tenMinutes(), 10min, 15, 25);
 }
 
-TEST(GSMScenarioTest, recordsAreAsTheirTablesSayButForTheOddOnes) {
+TEST(GSMScenarioTest, recordsMatchTheirTablesExceptUnusualOnes) {
     const RecordCensus census = censusOf(tenMinutes(), requirements);
     EXPECT_EQ(codesOf(census.good), codes);
     // One unusual message every ten seconds, a sixth of them of each kind.
@@ -104,7 +104,7 @@ TEST(GSMScenarioTest, recordsAreAsTheirTablesSayButForTheOddOnes) {
     EXPECT_LE(countOf(census.overrun), 20U);
 }
 
-TEST(GSMScenarioTest, everyKindOfOddMessageComes) {
+TEST(GSMScenarioTest, everyKindOfUnusualMessageOccurs) {
     const OddMessages odd = unusualMessagesOf(tenMinutes(), meets(requirements), codes);
     for (const int count : {odd.tooShort, odd.wrongType, odd.prefixed, odd.unknownCode})
         EXPECT_GE(count, 3);
@@ -250,7 +250,7 @@ TEST(GSMScenarioTest, aLocationUpdateRunsInProtocolOrder) {
     EXPECT_EQ(states, wanted);
 }
 
-TEST(GSMScenarioTest, theDriveGoesRound) {
+TEST(GSMScenarioTest, theDriveRepeats) {
     // Each round begins with a network search (registration state 5 after 0).
     int searches = 0;
     int last = -1;

@@ -109,7 +109,7 @@ TEST(LTEScenarioTest, sixToEightMessagesComeASecond) {
     expectRate(twentyMinutes(), 20min, 5, 9);
 }
 
-TEST(LTEScenarioTest, recordsAreAsTheirTablesSayButForTheOddOnes) {
+TEST(LTEScenarioTest, recordsMatchTheirTablesExceptUnusualOnes) {
     const RecordCensus census = censusOf(twentyMinutes(), requirements);
     EXPECT_EQ(codesOf(census.good), codes);
     // One unusual message every ten seconds, a sixth of them of each kind, alternating between these codes.
@@ -122,7 +122,7 @@ TEST(LTEScenarioTest, recordsAreAsTheirTablesSayButForTheOddOnes) {
     EXPECT_LE(countOf(census.overrun), 40U);
 }
 
-TEST(LTEScenarioTest, everyKindOfOddMessageComes) {
+TEST(LTEScenarioTest, everyKindOfUnusualMessageOccurs) {
     const OddMessages odd = unusualMessagesOf(twentyMinutes(), isGood, codes);
     for (const int count : {odd.tooShort, odd.wrongType, odd.prefixed, odd.unknownCode})
         EXPECT_GE(count, 3);

@@ -79,7 +79,7 @@ TEST(UTRANScenarioTest, aboutTenMessagesComeASecond) {
     expectRate(tenMinutes(), 10min, 7, 16);
 }
 
-TEST(UTRANScenarioTest, recordsAreAsTheirTablesSayButForTheOddOnes) {
+TEST(UTRANScenarioTest, recordsMatchTheirTablesExceptUnusualOnes) {
     const Drive drive = driveOf<UTRANScenario>(1, 30min);
     const RecordCensus census = censusOf(drive, requirements);
     EXPECT_EQ(codesOf(census.good), codes);
@@ -94,7 +94,7 @@ TEST(UTRANScenarioTest, recordsAreAsTheirTablesSayButForTheOddOnes) {
     EXPECT_LE(odd, 90U);
 }
 
-TEST(UTRANScenarioTest, everyKindOfOddMessageComes) {
+TEST(UTRANScenarioTest, everyKindOfUnusualMessageOccurs) {
     const OddMessages odd = unusualMessagesOf(tenMinutes(), meets(requirements), codes);
     for (const int count : {odd.tooShort, odd.wrongType, odd.prefixed, odd.unknownCode})
         EXPECT_GE(count, 3);

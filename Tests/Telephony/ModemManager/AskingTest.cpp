@@ -45,7 +45,7 @@ protected:
     InterfaceMap modem = testModem(lteAccess);
 };
 
-TEST_F(AskingTest, nothingIsAskedWhileNobodyListens) {
+TEST_F(AskingTest, nothingIsRequestedWithoutAListener) {
     put();
     follow();
     queue.advance(1h);
@@ -95,7 +95,7 @@ TEST_F(AskingTest, cellsAreAskedEveryThreeSecondsAndNeverTwiceAtATime) {
     EXPECT_EQ(mock.count("GetLocation"), 0U) << "the serving cell is known";
 }
 
-TEST_F(AskingTest, anAnswerThatComesAfterTheEndIsNobodys) {
+TEST_F(AskingTest, anAnswerAfterTheEndIsIgnored) {
     put();
     follow();
     mock.held = "GetCellInfo";
@@ -120,7 +120,7 @@ TEST_F(AskingTest, theSinkMayStopTheSource) {
     }
 }
 
-TEST_F(AskingTest, whatIsNotSupportedIsToldOnceAndTriedAgainAfterAMinute) {
+TEST_F(AskingTest, anUnsupportedRequestIsReportedOnceAndRetriedAfterAMinute) {
     refuse("GetCellInfo", "org.freedesktop.ModemManager1.Error.Core.Unsupported", "no cells");
     refuse("GetLocation", "org.freedesktop.ModemManager1.Error.Core.Unauthorized", "no place");
     refuse("Setup", "org.freedesktop.ModemManager1.Error.Core.Unsupported", "no levels");
@@ -187,7 +187,7 @@ TEST_F(AskingTest, theRateOfTheLevelsIsSetAndPutBack) {
     EXPECT_THAT(rates(), ElementsAre(5U, 0U));
 }
 
-TEST_F(AskingTest, aSlowerRateOfSomebodyElseIsPutBackAndAFasterOneLeft) {
+TEST_F(AskingTest, aSlowerForeignRateIsRestoredAndAFasterOneKept) {
     modem[Mock::signal] = {{"Rate", 30U}};
     put();
     follow();
@@ -231,7 +231,7 @@ protected:
               "<deny send_interface=\"org.freedesktop.ModemManager1.Modem\" send_member=\"GetCellInfo\"/>") {}
 };
 
-TEST_F(DenyingBusTest, thePlaceStandsInForTheCellsThatMayNotBeAskedFor) {
+TEST_F(DenyingBusTest, theLocationReplacesCellsThatMayNotBeQueried) {
     mock.answers["GetLocation"] = {
         {QVariant::fromValue(LocationMap{{1U, QDBusVariant(QString("001,01,0000,1A2D003,1005"))}})}, {}, {}};
     put();

@@ -92,7 +92,7 @@ TEST_F(SIMFilesTest, absurdFilesAreLeftOut) {
     }
 }
 
-TEST_F(SIMFilesTest, partsThatCannotBeReadAreToldOnceAndTriedAgain) {
+TEST_F(SIMFilesTest, unreadablePartsAreReportedOnceAndRetried) {
     mock.answers["GetAll"] = {{}, "org.freedesktop.DBus.Error.AccessDenied", "hands off"};
     putModem({{"Bearers", paths({Mock::bearerPath(0)})}});
     mock.put(Mock::bearerPath(0), {{Mock::bearer, {{"Connected", true}}}});

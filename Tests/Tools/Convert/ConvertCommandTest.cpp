@@ -179,7 +179,7 @@ TEST_F(ConvertCommandTest, InputIsNeverTheOutput) {
     EXPECT_EQ(contentOf("drive.pcapng"), before);
 }
 
-TEST_F(ConvertCommandTest, OutputThatIsNoFileIsLeftAlone) {
+TEST_F(ConvertCommandTest, NonFileOutputIsNotReplaced) {
     std::filesystem::create_directory(path("out/drive.dlf"));
     EXPECT_EQ(convert({"--force", path("drive.pcapng"), path("out/drive.dlf")}, 1),
               "velmora-log: " + path("out/drive.dlf") + " is no regular file\n");
@@ -188,7 +188,7 @@ TEST_F(ConvertCommandTest, OutputThatIsNoFileIsLeftAlone) {
                   ": cannot be opened for writing: No such file or directory\n");
 }
 
-TEST_F(ConvertCommandTest, LossIsToldAndTheRestConverted) {
+TEST_F(ConvertCommandTest, LossIsReportedAndTheRestConverted) {
     std::filesystem::resize_file(path("drive.pcapng"), std::filesystem::file_size(path("drive.pcapng")) - 6);
     for (const std::string form : {".pcapng", ".velmora", ".dlf"}) {
         const std::string words = convert({path("drive.pcapng"), path("out/drive" + form)}, 1);
@@ -199,7 +199,7 @@ TEST_F(ConvertCommandTest, LossIsToldAndTheRestConverted) {
     }
 }
 
-TEST_F(ConvertCommandTest, WhatADLFLogCannotHoldIsToldAndTheRestConverted) {
+TEST_F(ConvertCommandTest, UnrepresentableMessagesAreReportedAndTheRestConverted) {
     const auto offsets = writeRecording("odd.pcapng", "Ostrel_GSM",
                                         {{at(0), rrState(4)}, {at(1), hex("01 02 03")}, {at(2), rrState(5)}});
     EXPECT_EQ(convert({path("odd.pcapng"), path("out/odd.dlf")}, 1),
@@ -208,7 +208,7 @@ TEST_F(ConvertCommandTest, WhatADLFLogCannotHoldIsToldAndTheRestConverted) {
     EXPECT_THAT(messagesOf("out/odd.dlf"), ElementsAre(rrState(4), rrState(5)));
 }
 
-TEST_F(ConvertCommandTest, MessagesLeftOutAreToldUpToAHundred) {
+TEST_F(ConvertCommandTest, SkippedMessagesAreReportedUpToAHundred) {
     std::vector<TimedMessage> messages(103, {at(0), hex("01")});
     messages.push_back({at(1), rrState(5)});
     writeRecording("odd.pcapng", "Ostrel_GSM", messages);
@@ -289,7 +289,7 @@ TEST_F(ConvertCommandTest, InterruptedConversionLeavesNothing) {
     EXPECT_THAT(outputs(), ElementsAre());
 }
 
-TEST_F(ConvertCommandTest, FileThatIsNotThereIsTold) {
+TEST_F(ConvertCommandTest, MissingFileIsReported) {
     EXPECT_EQ(convert({path("gone.pcapng"), path("out/gone.dlf")}, 1),
               "velmora-log: " + path("gone.pcapng") + ": cannot open: No such file or directory\n");
     EXPECT_THAT(outputs(), ElementsAre());

@@ -137,7 +137,7 @@ TEST_F(DecodeCommandTest, RecordingWithoutMessagesHasAnEmptyDisplay) {
     EXPECT_EQ(text.output(), "");
 }
 
-TEST_F(DecodeCommandTest, TechnologyGoesBeforeTheOneThatTheFileNames) {
+TEST_F(DecodeCommandTest, TechnologyOptionOverridesTheFile) {
     writeRecording("a.pcapng", "Nonesuch", {{at(0), rrState(4)}, {at(0), rrState(5)}});
     for (const char* name : {"Ostrel_GSM", "kVoxLogChannelTechnology_Ostrel_GSM"}) {
         ToolProcess process(tool({"decode", "--format", "json", "--technology", name, path("a.pcapng")}));
@@ -146,7 +146,7 @@ TEST_F(DecodeCommandTest, TechnologyGoesBeforeTheOneThatTheFileNames) {
     }
 }
 
-TEST_F(DecodeCommandTest, UnknownOrMissingTechnologyIsToldWithThoseThatThereAre) {
+TEST_F(DecodeCommandTest, UnknownOrMissingTechnologyIsReportedWithTheValidOnes) {
     constexpr const char* names = "wanted one of IFX, Ostrel_GSM, Ostrel_CDMA, Ostrel_LTE, Ostrel_UTRAN2";
     writeRecording("none.pcapng", "", {{at(0), rrState(5)}});
     writeRecording("other.pcapng", "Nonesuch", {{at(0), rrState(5)}});
@@ -189,7 +189,7 @@ TEST_F(DecodeCommandTest, FileThatIsNoRecordingIsRefused) {
               "velmora-log: standard input: empty, wanted a recording, a snapshot or a DLF log\n");
 }
 
-TEST_F(DecodeCommandTest, TemplateThatCannotBeReadIsTold) {
+TEST_F(DecodeCommandTest, UnreadableTemplateIsReported) {
     writeDrive("drive.pcapng");
     const std::string place = path("resources/Ostrel_GSM.plist");
     std::filesystem::remove(place);
@@ -226,7 +226,7 @@ TEST_F(DecodeCommandTest, RecordsThatDecodersDropAreNoBadInput) {
     EXPECT_THAT(process.errors(), HasSubstr("<3>Invalid log type: 2. Dropping.\n"));
 }
 
-TEST_F(DecodeCommandTest, UnreadableSimFilesEndTheProgramInTheirWords) {
+TEST_F(DecodeCommandTest, UnreadableSimFilesEndTheProgramWithTheirMessage) {
     const std::vector<std::uint64_t> offsets = writeRecording(
         "sim.pcapng", "Ostrel_GSM",
         {{at(0), rrState(5)}, {at(1), record(0x0000, "DE AD BE EF", 0xFF)}, {at(2), rrState(4)}});
@@ -239,7 +239,7 @@ TEST_F(DecodeCommandTest, UnreadableSimFilesEndTheProgramInTheirWords) {
                                                  ": SIM File dictionary data could not be constructed\n");
 }
 
-TEST_F(DecodeCommandTest, UnreadableSerializedObjectEndsTheProgramInItsWords) {
+TEST_F(DecodeCommandTest, UnreadableSerializedObjectEndsTheProgramWithItsMessage) {
     const std::vector<std::uint64_t> offsets =
         writeRecording("ifx.pcapng", "IFX", {{at(0), hex("00 01 02 03")}});
     ToolProcess process(tool({"decode", path("ifx.pcapng")}));
@@ -262,7 +262,7 @@ TEST_F(DecodeCommandTest, ClosedPipeEndsItQuietly) {
     EXPECT_EQ(ownMessages(process.errors()), "");
 }
 
-TEST_F(DecodeCommandTest, FullDiskIsTold) {
+TEST_F(DecodeCommandTest, FullDiskIsReported) {
     writeDrive("drive.pcapng");
     ToolProcess::Setup setup = tool({"decode", path("drive.pcapng")});
     setup.outputFile = "/dev/full";
@@ -272,7 +272,7 @@ TEST_F(DecodeCommandTest, FullDiskIsTold) {
               "velmora-log: cannot write standard output: No space left on device\n");
 }
 
-TEST_F(DecodeCommandTest, ClosedStandardOutputIsTold) {
+TEST_F(DecodeCommandTest, ClosedStandardOutputIsReported) {
     writeDrive("drive.pcapng");
     ToolProcess process(
         tool({"-c", "exec \"$0\" decode \"$1\" >&-", VELMORA_BUILD_DIR "/velmora-log", path("drive.pcapng")}),

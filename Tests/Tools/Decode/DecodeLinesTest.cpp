@@ -93,7 +93,7 @@ TEST_F(DecodeLinesTest, SelectionRestrictsEveryFormat) {
     EXPECT_EQ(decode({"--select", "/Nothing", path("a.pcapng")}), "");
 }
 
-TEST_F(DecodeLinesTest, LinesBeforeAFailureOfTheDecoderAreWhole) {
+TEST_F(DecodeLinesTest, LinesBeforeADecoderFailureAreComplete) {
     const std::vector<std::uint64_t> offsets = writeRecording(
         "sim.pcapng", "Ostrel_GSM", {{at(0), rrState(5)}, {at(1), record(0x0000, "DE AD BE EF", 0xFF)}});
     ToolProcess process(tool({"decode", "--format", "jsonl", "--every", "message", path("sim.pcapng")}));
@@ -119,7 +119,7 @@ TEST_F(DecodeLinesTest, LinesOfAPipeComeWithEachRefresh) {
     EXPECT_EQ(process.output(), std::string("{") + firstRefresh + "\n{" + secondRefresh + "\n");
 }
 
-TEST_F(DecodeLinesTest, FullDiskIsTold) {
+TEST_F(DecodeLinesTest, FullDiskIsReported) {
     writeDrive("a.pcapng");
     for (const std::vector<std::string>& format :
          {std::vector<std::string>{"--format", "jsonl"}, {"--format", "csv", "--select", "/SIM Info"}}) {

@@ -154,7 +154,7 @@ TEST_F(DecodingTest, TimeStampsMayGoBackAndJumpAhead) {
                 ElementsAre(Refresh{at(2000), "RR_INACTIVE"}, Refresh{Time::max(), "RR_IDLE"}));
 }
 
-TEST_F(DecodingTest, RefreshesThatTheFileTellsOfGoBeforeTheTicks) {
+TEST_F(DecodingTest, RefreshesRecordedInTheFileReplaceTheTicks) {
     const std::vector<TimedMessage> messages = {{at(0), rrState(4)},
                                                 {at(1000), rrState(5)},
                                                 {at(7000), rrState(0)},
@@ -169,7 +169,7 @@ TEST_F(DecodingTest, RefreshesThatTheFileTellsOfGoBeforeTheTicks) {
                 ElementsAre(Refresh{at(1500), "RR_PLMN_LIST_CONSTRUCTION"}));
 }
 
-TEST_F(DecodingTest, MessagesOutsideOfTheRangeArePassedOver) {
+TEST_F(DecodingTest, MessagesOutsideTheRangeAreSkipped) {
     const std::vector<TimedMessage> messages = {
         {at(0), rrState(4)}, {at(1000), rrState(5)}, {at(2999), rrState(0)}, {at(3000), rrState(1)}};
     // The start belongs to the range and the end does not; ticks count from the first message inside.

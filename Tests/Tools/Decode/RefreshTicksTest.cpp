@@ -45,7 +45,7 @@ TEST(RefreshTicksTest, TicksWithoutMessagesDoNotRefresh) {
     EXPECT_EQ(ticks.before(start + 102s), start + 102s);
 }
 
-TEST(RefreshTicksTest, TimeThatGoesBackMakesNoTickDue) {
+TEST(RefreshTicksTest, BackwardTimeCausesNoTick) {
     RefreshTicks ticks;
     EXPECT_EQ(ticks.before(start), std::nullopt);
     EXPECT_EQ(ticks.before(start - 3600s), std::nullopt);

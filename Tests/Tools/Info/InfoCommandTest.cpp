@@ -149,7 +149,7 @@ TEST_F(InfoCommandTest, TechnologyIsTheUsersBeforeTheFiles) {
     EXPECT_THAT(process.output(), testing::EndsWith("  0x512C            1  GSM RR Info\n"));
 }
 
-TEST_F(InfoCommandTest, FileThatIsNotThereIsTold) {
+TEST_F(InfoCommandTest, MissingFileIsReported) {
     ToolProcess process(tool({"info", path("gone.pcapng")}));
     EXPECT_EQ(process.exitStatus(), 1);
     EXPECT_EQ(process.output(), "");

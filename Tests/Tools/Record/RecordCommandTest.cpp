@@ -102,14 +102,14 @@ TEST_F(RecordCommandTest, FileThatIsThereIsKeptUnlessForced) {
     EXPECT_THAT(messagesOf("drive.pcapng", "Ostrel_GSM"), ElementsAre(rrState(5)));
 }
 
-TEST_F(RecordCommandTest, FileThatCannotBeMadeIsToldAtOnce) {
+TEST_F(RecordCommandTest, UncreatableFileIsReportedImmediately) {
     ToolProcess process(tool({"record", path("nowhere/drive.pcapng")}));
     EXPECT_EQ(process.exitStatus(), 1);
     EXPECT_EQ(ownMessages(process.errors()),
               "velmora-log: cannot create " + path("nowhere/drive.pcapng") + ": No such file or directory\n");
 }
 
-TEST_F(RecordCommandTest, FullDiskIsToldAtOnce) {
+TEST_F(RecordCommandTest, FullDiskIsReportedImmediately) {
     startService();
     ToolProcess process(tool({"record", "/dev/full"}));
     EXPECT_EQ(process.exitStatus(), 1);
@@ -133,7 +133,7 @@ TEST_F(RecordCommandTest, AnotherTechnologyEndsTheRecording) {
     EXPECT_THAT(messagesOf("drive.pcapng", "Ostrel_GSM"), ElementsAre(rrState(5)));
 }
 
-TEST_F(RecordCommandTest, TechnologyWithoutADecoderIsTold) {
+TEST_F(RecordCommandTest, TechnologyWithoutADecoderIsReported) {
     startService("Nonesuch");
     ToolProcess process(tool({"record", path("drive.pcapng")}));
     EXPECT_EQ(process.exitStatus(), 1);

@@ -63,7 +63,7 @@ TEST_F(RecordErrorTest, FileThatMayNotGrowIsWrittenWhenItMay) {
                 ElementsAre(rrState(1), rrState(2), rrState(3), rrState(4), rrState(5), rrState(6)));
 }
 
-TEST_F(RecordErrorTest, MessagesThatFindNoRoomAreCounted) {
+TEST_F(RecordErrorTest, MessagesBeyondTheQueueAreCounted) {
     startService();
     ToolProcess process(tool({"record", _file}));
     ASSERT_TRUE(isStreaming());
@@ -89,7 +89,7 @@ TEST_F(RecordErrorTest, MessagesThatFindNoRoomAreCounted) {
     EXPECT_THAT(messagesOf("drive.pcapng", "Ostrel_GSM"), ElementsAre(rrState(1), large, large));
 }
 
-TEST_F(RecordErrorTest, MessagesThatAreNotSavedInTheEndAreTold) {
+TEST_F(RecordErrorTest, UnsavedMessagesAreReportedAtTheEnd) {
     startService();
     ToolProcess::Setup setup = tool({"record", _file});
     setup.environment["GCOV_PREFIX"] = path("counts"); // a program that counts its coverage spoils its files
@@ -109,7 +109,7 @@ TEST_F(RecordErrorTest, MessagesThatAreNotSavedInTheEndAreTold) {
     EXPECT_THAT(messagesOf("drive.pcapng", "Ostrel_GSM"), ElementsAre(rrState(1)));
 }
 
-TEST_F(RecordErrorTest, ServiceThatGoesAndComesBackIsTold) {
+TEST_F(RecordErrorTest, LostAndRestartedServiceIsReported) {
     startService();
     ToolProcess process(tool({"record", _file}));
     ASSERT_TRUE(isStreaming());
@@ -161,7 +161,7 @@ TEST_F(RecordErrorTest, TerminalShowsProgress) {
     EXPECT_THAT(rest, testing::Not(testing::HasSubstr("bytes, "))) << "the progress is gone";
 }
 
-TEST_F(RecordErrorTest, KilledRecorderLacksTheLastSecondAtMost) {
+TEST_F(RecordErrorTest, KilledRecorderLosesTheLastSecondAtMost) {
     using Instant = std::chrono::steady_clock::time_point;
     struct Victim {
         std::string name;

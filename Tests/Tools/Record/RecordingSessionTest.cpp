@@ -128,7 +128,7 @@ TEST_F(RecordingSessionTest, ProgramThatEndsAbruptlyRemovesOnlyAnEmptyFile) {
     EXPECT_THAT(files(), ElementsAre("drive.pcapng"));
 }
 
-TEST_F(RecordingSessionTest, EmptyFileOfSomebodyElsesIsNotRemoved) {
+TEST_F(RecordingSessionTest, ForeignEmptyFileIsNotRemoved) {
     std::ofstream(_file).close();
     {
         const auto session = RecordingSession::open(_file, true);

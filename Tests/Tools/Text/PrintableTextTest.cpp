@@ -49,7 +49,7 @@ TEST(PrintableTextTest, WidthCountsTerminalColumns) {
     EXPECT_EQ(displayWidth("\xF0\x9F\x8C\xA1"), 1U);         // thermometer, which shows as text
 }
 
-TEST(PrintableTextTest, ClippedTextFitsAndTellsThatItWasCut) {
+TEST(PrintableTextTest, ClippedTextFitsAndEndsInAnEllipsis) {
     EXPECT_EQ(clipped("abcdef", 6), "abcdef");
     EXPECT_EQ(clipped("abcdef", 5), "abcd…");
     EXPECT_EQ(clipped("abcdef", 1), "…");

@@ -16,7 +16,7 @@ std::vector<TreeRow> rowsOf(std::size_t count) {
     return rows;
 }
 
-TEST(TerminalFrameTest, RowsStandAboveTheStatusLine) {
+TEST(TerminalFrameTest, RowsAreAboveTheStatusLine) {
     const std::vector<TreeRow> rows = {{"Cell", true}, {"  ARFCN  33", false}};
     EXPECT_EQ(composeFrame(rows, "Connecting...", {20, 4}, 0), "\x1b[H"
                                                                "\x1b[1mCell\x1b[0m\x1b[K\r\n"
@@ -38,7 +38,7 @@ TEST(TerminalFrameTest, LongRowsAndStatusAreCutAtTheWindow) {
               "\x1b[7m0123456…\x1b[0m");
 }
 
-TEST(TerminalFrameTest, ScrolledScreenTellsWhereItIs) {
+TEST(TerminalFrameTest, ScrolledScreenShowsItsPosition) {
     EXPECT_EQ(composeFrame(rowsOf(10), "ok", {12, 4}, 5), "\x1b[H"
                                                           "row 5\x1b[K\r\n"
                                                           "row 6\x1b[K\r\n"

@@ -148,7 +148,7 @@ TEST_F(WatchCommandTest, ClosedPipeEndsItQuietlyWithoutARefresh) {
     EXPECT_EQ(ownMessages(process.errors()), "");
 }
 
-TEST_F(WatchCommandTest, FullDiskIsTold) {
+TEST_F(WatchCommandTest, FullDiskIsReported) {
     ToolProcess::Setup setup = tool({"watch"});
     setup.outputFile = "/dev/full";
     ToolProcess process(setup);
@@ -169,7 +169,7 @@ TEST_F(WatchCommandTest, SeveralWatchersRunAtOnce) {
     EXPECT_THAT(other.output(), EndsWith("\nBand  GSM 900\n"));
 }
 
-TEST_F(WatchCommandTest, UnreadableSimFilesEndTheProgramInTheirWords) {
+TEST_F(WatchCommandTest, UnreadableSimFilesEndTheProgramWithTheirMessage) {
     startService("Ostrel_GSM");
     ToolProcess process(onTerminal({"watch"}));
     ASSERT_TRUE(isStreaming());

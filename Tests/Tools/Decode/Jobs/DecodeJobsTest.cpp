@@ -16,7 +16,7 @@ using testing::StartsWith;
 
 class DecodeJobsTest : public DecodeLinesTest {};
 
-TEST_F(DecodeJobsTest, JobsPrintWhatOneAfterTheOtherPrints) {
+TEST_F(DecodeJobsTest, ParallelJobsPrintWhatSequentialOnesPrint) {
     writeDrive("a.pcapng");
     writeRecording("empty.pcapng", "Ostrel_GSM", {});
     // More than a pipe holds, at both ends of the row.
