@@ -59,7 +59,7 @@ void declare(CLI::App& app, Options& options) {
         ->check(CLI::Range(0, 7))
         ->capture_default_str();
     app.add_flag("--start-service", options.startsService,
-                 "Bring up the telephony service first where none is running");
+                 "Start the telephony service first where none is running");
     app.add_flag("--self-test", options.isSelfTest, "Open every screen on the first data, then exit");
     app.footer("Velmora shows what a telephony service sends. With a synthetic drive as the service:\n"
                "  velmora-telephonyd --source scenario:gsm,seed=1 &\n"

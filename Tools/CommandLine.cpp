@@ -42,11 +42,11 @@ CommandLine parseCommandLine(int count, const char* const* arguments) {
     app.add_option_function<std::string>(
            "--log",
            [&line](const std::string& name) { line.log = logKindNamed(name).value_or(LogKind::Stderr); },
-           "Where log lines go, stderr unless told otherwise")
+           "Where log lines go; the default is stderr")
         ->check(oneOf({"syslog", "stderr"}))
         ->type_name("syslog|stderr");
     app.add_option("--log-level", line.logLevel,
-                   "The least urgent log lines that are written, 0 to 7; 3 unless told otherwise")
+                   "The least urgent log lines that are written, 0 to 7; the default is 3")
         ->check(validLogLevel())
         ->type_name("N");
     app.footer("Exit status: 0 done, 1 the input was bad, 2 usage.\n\n"
@@ -76,7 +76,7 @@ CommandLine parseCommandLine(int count, const char* const* arguments) {
             line.command = CommandLine::Notice{ExitStatus::Done, out.str()};
         else
             line.command = CommandLine::Notice{ExitStatus::Usage, "velmora-log: " + usageError(app, error) +
-                                                                      "\nvelmora-log --help tells more\n"};
+                                                                      "\nsee velmora-log --help\n"};
         return line;
     }
     if (decodeCommand->parsed())

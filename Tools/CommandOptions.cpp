@@ -42,7 +42,7 @@ CLI::Validator positiveCount() {
 void addTechnology(CLI::App& command, std::string& technology, const std::string& purpose) {
     command
         .add_option("--technology", technology,
-                    purpose + " this technology, whatever the file says: " + technologyNames())
+                    purpose + " this technology, overriding the file's: " + technologyNames())
         ->type_name("NAME");
 }
 

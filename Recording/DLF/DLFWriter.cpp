@@ -30,7 +30,7 @@ std::string whyUnfit(Bytes message) {
                std::to_string(LogMessage::headerLength) + " at least";
     if (parsed->length() != parsed->record.size() - 1)
         return "record length " + std::to_string(parsed->length()) + " in a message whose record has " +
-               std::to_string(parsed->record.size() - 1) + " bytes behind its type";
+               std::to_string(parsed->record.size() - 1) + " bytes after its type";
     return {};
 }
 

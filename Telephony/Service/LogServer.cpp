@@ -90,13 +90,13 @@ Value LogServer::createChannel(const Data& request) {
     }
     removeClosedChannels();
     if (_channels.size() >= maximumChannels) {
-        logFormat(LogPriority::Error, "%s wants a log channel, but %zu are open already", name->c_str(),
+        logFormat(LogPriority::Error, "%s requests a log channel, but %zu are open already", name->c_str(),
                   _channels.size());
         return refusal(Refusal::TooManyChannels);
     }
     std::shared_ptr<RemotePort> application = _ports.createRemote(*name);
     if (!application) {
-        logFormat(LogPriority::Error, "%s wants a log channel, but there is no such port", name->c_str());
+        logFormat(LogPriority::Error, "%s requests a log channel, but there is no such port", name->c_str());
         return refusal(Refusal::NoSuchPort);
     }
     // A name has one owner: an open channel to that name is one to an owner who has gone, or an earlier one
@@ -106,7 +106,7 @@ Value LogServer::createChannel(const Data& request) {
             close(*channel, *name + " has gone");
     std::shared_ptr<LocalPort> commands = createChannelPort();
     if (!commands) {
-        logFormat(LogPriority::Error, "%s wants a log channel, but no port can be made for it",
+        logFormat(LogPriority::Error, "%s requests a log channel, but no port can be made for it",
                   name->c_str());
         return refusal(Refusal::NoChannelPort);
     }

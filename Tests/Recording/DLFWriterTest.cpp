@@ -96,9 +96,9 @@ TEST_F(DLFWriterTest, refusesMessagesThatHideTheNextRecord) {
         {"01 0B00 2C51 00000000000000", "message of 12 bytes, wanted a record header of 13 at least"},
         {"8171 01 0B00 2C51 00000000000000", "message of 14 bytes, wanted a record header of 13 at least"},
         {"01 1100 2C51 0000000000000000 05000100",
-         "record length 17 in a message whose record has 16 bytes behind its type"},
+         "record length 17 in a message whose record has 16 bytes after its type"},
         {"8171 01 0000 2C51 0000000000000000 05",
-         "record length 0 in a message whose record has 13 bytes behind its type"},
+         "record length 0 in a message whose record has 13 bytes after its type"},
     };
     const auto writer = make();
     for (const Case& each : cases) {

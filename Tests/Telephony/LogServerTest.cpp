@@ -38,7 +38,7 @@ TEST_F(LogServerTest, refusesAPortThatIsNotThere) {
     EXPECT_EQ(request(serverName, plist({{"CreateLogChannel", "nobody"}})), dictionary({{"Error", 1}}));
     EXPECT_EQ(server.channelCount(), 0U);
     EXPECT_FALSE(ports.isTaken("com.velmora.vox.server.channel.1"));
-    EXPECT_THAT(errors(), ElementsAre("nobody wants a log channel, but there is no such port"));
+    EXPECT_THAT(errors(), ElementsAre("nobody requests a log channel, but there is no such port"));
 }
 
 TEST_F(LogServerTest, refusesMalformedRequests) {
@@ -61,7 +61,7 @@ TEST_F(LogServerTest, refusesWhenNoChannelPortCanBeMade) {
     ports.serve("app", [](std::int32_t, const Data&, bool) { return RemotePort::Answer{}; });
     ports.failNextLocal();
     EXPECT_EQ(request(serverName, plist({{"CreateLogChannel", "app"}})), dictionary({{"Error", 4}}));
-    EXPECT_THAT(errors(), ElementsAre("app wants a log channel, but no port can be made for it"));
+    EXPECT_THAT(errors(), ElementsAre("app requests a log channel, but no port can be made for it"));
     EXPECT_EQ(ports.connectionCount("app"), 0U);
 }
 
@@ -71,7 +71,7 @@ TEST_F(LogServerTest, boundsTheChannels) {
         createChannel("app" + std::to_string(i));
     ports.serve("late", [](std::int32_t, const Data&, bool) { return RemotePort::Answer{}; });
     EXPECT_EQ(request(serverName, plist({{"CreateLogChannel", "late"}})), dictionary({{"Error", 3}}));
-    EXPECT_THAT(errors(), ElementsAre("late wants a log channel, but 64 are open already"));
+    EXPECT_THAT(errors(), ElementsAre("late requests a log channel, but 64 are open already"));
     ports.sever("app0");
     EXPECT_EQ(createChannel("late"), "com.velmora.vox.server.channel.65");
 }
