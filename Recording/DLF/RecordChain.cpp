@@ -32,7 +32,7 @@ std::optional<RecordChain::Record> RecordChain::next() {
     _input.skip(std::exchange(_present, 0));
     while (_input.ensure(1)) {
         const Survey here = survey();
-        // Unless both ends of it are sure, one record may framing to another by chance: a damaged length hits
+        // Unless both ends of it are sure, one record may lead to another by chance: a damaged length hits
         // a record now and then, and after a message that was cut short one may end where its length says.
         if (here.linked && (std::min(here.linked->score, here.linked->followerScore) >= _weights.sure ||
                             !containsBetterRecord(*here.linked)))
@@ -103,7 +103,7 @@ bool RecordChain::isConvincingAt(std::size_t at, int least) {
         if (framing == Framing::PartialPrefix || framing == Framing::OtherType)
             continue;
         std::optional<RecordCandidate> candidate = candidateAt(at, framing, _timestamp);
-        // Any two bytes may be a length: what they framing to is looked at only with some score.
+        // Any two bytes may be a length: what they lead to is read only with some score.
         if (!candidate || (framing == Framing::Nothing && candidate->score < 0))
             continue;
         if (scoreFollower(at, *candidate) && candidate->followerScore >= _weights.goodFollower &&
@@ -170,7 +170,7 @@ void RecordChain::skipDamage(const Survey& survey) {
                       std::to_string(survey.truncated->size) + " bytes";
     else if (header)
         loss.reason =
-            "record length " + std::to_string(header->length) + " does not framing to another record";
+            "record length " + std::to_string(header->length) + " does not lead to another record";
     else
         loss.reason = "no log record";
     // Raw material is whole; a log's writer may have stopped in the middle of a record.

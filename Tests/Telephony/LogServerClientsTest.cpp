@@ -259,7 +259,7 @@ TEST(LogServerRoomTest, waitsForASlowClientButNotForAStuckOne) {
     ports.port->waiting = 1'000'000;
     EXPECT_FALSE(source.sink->hasRoom());
     queue.advance(900ms);
-    EXPECT_FALSE(source.sink->hasRoom()) << "slowClientTimeout began anew";
+    EXPECT_FALSE(source.sink->hasRoom()) << "the time-out restarted";
     queue.advance(200ms);
     EXPECT_TRUE(source.sink->hasRoom()) << "it is stuck";
     ports.port->waiting = 10;

@@ -157,7 +157,7 @@ Report neighbours(Context& context) {
         cells.push_back(cell);
     }
     if (cells.empty())
-        return std::nullopt; // the record cannot addStep that there are none
+        return std::nullopt; // the record cannot express an empty list
     return lteNeighbours(lteCarriers[carrier], cells);
 }
 
