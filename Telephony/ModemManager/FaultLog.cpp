@@ -7,7 +7,7 @@
 
 namespace velmora {
 
-void FaultLog::tell(std::string_view subject, const std::string& text) {
+void FaultLog::report(std::string_view subject, const std::string& text) {
     std::string& told = _reported[std::string(subject)];
     if (told == text)
         return;
@@ -15,7 +15,7 @@ void FaultLog::tell(std::string_view subject, const std::string& text) {
     logFormat(LogPriority::Warning, "modemmanager: %s", text.c_str());
 }
 
-void FaultLog::over(std::string_view subject) {
+void FaultLog::clear(std::string_view subject) {
     if (const auto told = _reported.find(subject); told != _reported.end())
         _reported.erase(told);
 }

@@ -15,9 +15,9 @@ namespace velmora {
 class FaultLog {
 public:
     /// Precondition: the subject is one of few; it is not shown.
-    void tell(std::string_view subject, const std::string& text);
+    void report(std::string_view subject, const std::string& text);
     /// Clears the subject's fault: its next fault is logged again.
-    void over(std::string_view subject);
+    void clear(std::string_view subject);
 
 private:
     std::map<std::string, std::string, std::less<>> _reported; ///< the last text by subject

@@ -45,7 +45,7 @@ enum class MemberUse : std::uint8_t {
     Bearer,      ///< a bearer's dictionary of display values among the packet-data contexts
     Link,        ///< every bearer's dictionary: the radio link that carries it
     Service,     ///< no record: the service itself uses it
-    Nothing,     ///< not used
+    Unused,
 };
 
 /// A row of the table of what ModemManager's members become.

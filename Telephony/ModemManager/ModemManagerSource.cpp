@@ -45,7 +45,7 @@ void ModemManagerSource::beginSession() {
 
 void ModemManagerSource::send(const RecordBuilder& record) {
     if (_sink)
-        _sink->take(record.message(_clock.now()));
+        _sink->receive(record.message(_clock.now()));
 }
 
 void ModemManagerSource::modemChosen() {

@@ -131,7 +131,7 @@ bool hasServingCell(const Dictionaries& cells) {
     });
 }
 
-DictionaryRef placeOf(const Value& location, const Modem& modem) {
+DictionaryRef servingCellFromLocation(const Value& location, const Modem& modem) {
     const Dictionary* sources = location.asDictionary();
     const std::string* place = sources ? (*sources)[mm::location3gppKey].asString() : nullptr;
     if (!place)

@@ -31,7 +31,7 @@ using Dictionaries = std::vector<DictionaryRef>;
 [[nodiscard]] bool hasServingCell(const Dictionaries& cells);
 /// The serving cell that an answer of GetLocation names; null where it names none. The modem's properties
 /// give its technology.
-[[nodiscard]] DictionaryRef placeOf(const Value& location, const Modem& modem);
+[[nodiscard]] DictionaryRef servingCellFromLocation(const Value& location, const Modem& modem);
 
 /// The SIM's files; `sim` are the properties of the SIM object.
 [[nodiscard]] DictionaryRef simFilesOf(const Modem& modem, const Dictionary& sim);

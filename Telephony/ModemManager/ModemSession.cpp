@@ -38,7 +38,7 @@ ModemSession::ModemSession(MainQueue& queue, ModemFollower& follower, Reports re
       _name("modem " + std::to_string(follower.modem()->index)) {
     after(std::chrono::nanoseconds::zero(), [this] {
         modemChanged();
-        turn();
+        poll();
     });
 }
 
@@ -61,7 +61,7 @@ void ModemSession::call(const BusCall& call, std::function<void(const BusReply&)
         });
 }
 
-void ModemSession::turn() {
+void ModemSession::poll() {
     if (_partPolls > 0 && --_partPolls == 0)
         for (const auto& [path, part] : _parts)
             if (!part.properties)
@@ -70,8 +70,8 @@ void ModemSession::turn() {
 }
 
 void ModemSession::requestCells() {
-    if (_cellQuestion.turns > 0) {
-        --_cellQuestion.turns;
+    if (_cellQuery.pollsToSkip > 0) {
+        --_cellQuery.pollsToSkip;
         return askLocation({});
     }
     call({.path = _path,
@@ -81,10 +81,10 @@ void ModemSession::requestCells() {
           .timeout = cellTimeout},
          [this](const BusReply& reply) {
              if (reply.failed()) {
-                 refused(_cellQuestion, reply, "cell information");
+                 refused(_cellQuery, reply, "cell information");
                  return askLocation({});
              }
-             _follower.faults().over(_cellQuestion.subject);
+             _follower.faults().clear(_cellQuery.subject);
              const Modem* modem = _follower.modem();
              Dictionaries cells = modem ? cellsOf(reply.value, *modem) : Dictionaries();
              if (hasServingCell(cells))
@@ -95,17 +95,18 @@ void ModemSession::requestCells() {
 
 void ModemSession::askLocation(Dictionaries cells) {
     const Modem* modem = _follower.modem();
-    if (_locationQuestion.turns > 0)
-        --_locationQuestion.turns;
+    if (_locationQuery.pollsToSkip > 0)
+        --_locationQuery.pollsToSkip;
     else if (modem && modem->has(mm::location))
         return call({.path = _path, .interface = mm::location, .method = "GetLocation", .arguments = {}},
                     [this, known = std::move(cells)](const BusReply& reply) mutable {
                         const Modem* followed = _follower.modem();
                         if (reply.failed())
-                            refused(_locationQuestion, reply, "its place in the network");
+                            refused(_locationQuery, reply, "its place in the network");
                         else
-                            _follower.faults().over(_locationQuestion.subject);
-                        if (const DictionaryRef place = followed ? placeOf(reply.value, *followed) : nullptr)
+                            _follower.faults().clear(_locationQuery.subject);
+                        if (const DictionaryRef place =
+                                followed ? servingCellFromLocation(reply.value, *followed) : nullptr)
                             known.insert(known.begin(), place);
                         endPoll(known);
                     });
@@ -113,28 +114,28 @@ void ModemSession::askLocation(Dictionaries cells) {
 }
 
 void ModemSession::endPoll(const Dictionaries& cells) {
-    after(cellInterval, [this] { turn(); });
+    after(cellInterval, [this] { poll(); });
     // An empty list is reported once: it clears the display.
     if (std::exchange(_hadCells, !cells.empty()) || !cells.empty())
         _reports.cells(cells);
 }
 
-void ModemSession::refused(Question& question, const BusReply& reply, std::string_view what) {
-    reportFault(question.subject, reply, what);
-    // Others may be over at the next turn: a modem that is not enabled yet, one that was busy.
+void ModemSession::refused(Query& query, const BusReply& reply, std::string_view what) {
+    reportFault(query.subject, reply, what);
+    // Others may be over at the next poll: a modem that is not enabled yet, one that was busy.
     if (reply.isUnsupported() || reply.isDenied())
-        question.turns = pollsAfterRefusal - 1;
+        query.pollsToSkip = pollsAfterRefusal - 1;
 }
 
 void ModemSession::reportFault(std::string_view subject, const BusReply& reply, std::string_view what) {
     const std::string end = std::string(what) + " (" + reply.reason() + ')';
     FaultLog& faults = _follower.faults();
     if (reply.isUnsupported())
-        faults.tell(subject, _name + " does not support " + end);
+        faults.report(subject, _name + " does not support " + end);
     else if (reply.isDenied())
-        faults.tell(subject, "no permission to ask " + _name + " for " + end);
+        faults.report(subject, "no permission to ask " + _name + " for " + end);
     else
-        faults.tell(subject, _name + " does not give " + end);
+        faults.report(subject, _name + " does not give " + end);
 }
 
 void ModemSession::setSignalRate() {
@@ -152,7 +153,7 @@ void ModemSession::setSignalRate() {
     call({.path = _path, .interface = mm::signal, .method = "Setup", .arguments = {signalRate}},
          [this](const BusReply& reply) {
              if (!reply.failed())
-                 return _follower.faults().over("levels");
+                 return _follower.faults().clear("levels");
              _earlierRate.reset();
              reportFault("levels", reply, "its levels");
          });
@@ -172,8 +173,8 @@ void ModemSession::modemChanged() {
     if (!(state == _state)) {
         // What was refused in the one state may be granted in the next.
         _state = state;
-        _cellQuestion.turns = 0;
-        _locationQuestion.turns = 0;
+        _cellQuery.pollsToSkip = 0;
+        _locationQuery.pollsToSkip = 0;
         if (!_earlierRate)
             _hadSignal = false;
     }
@@ -222,7 +223,7 @@ void ModemSession::readPart(const std::string& path) {
                  _partPolls = pollsAfterRefusal;
                  return reportFault(isSIM ? "SIM" : "bearer", reply, isSIM ? "its SIM" : "a bearer");
              }
-             _follower.faults().over(isSIM ? "SIM" : "bearer");
+             _follower.faults().clear(isSIM ? "SIM" : "bearer");
              const DictionaryRef properties = reply.value.dictionaryRef();
              part->second.properties = properties ? properties : makeDictionary();
          });

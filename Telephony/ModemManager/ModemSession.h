@@ -57,9 +57,9 @@ public:
 
 private:
     /// A query that may be refused, and for how many intervals it is skipped.
-    struct Question {
+    struct Query {
         std::string_view subject;
-        int turns = 0;
+        int pollsToSkip = 0;
     };
     /// The SIM or a bearer.
     struct Part {
@@ -68,11 +68,11 @@ private:
         DictionaryRef properties; ///< null until they have been reported
     };
 
-    void turn();
+    void poll();
     void requestCells();
     void askLocation(Dictionaries cells);
     void endPoll(const Dictionaries& cells);
-    void refused(Question& question, const BusReply& reply, std::string_view what);
+    void refused(Query& query, const BusReply& reply, std::string_view what);
     void reportFault(std::string_view subject, const BusReply& reply, std::string_view what);
     void setSignalRate();
     void restoreSignalRate();
@@ -93,8 +93,8 @@ private:
     Reports _reports;
     std::string _path; ///< the modem's
     std::string _name; ///< "modem 0", for messages
-    Question _cellQuestion{"cells"};
-    Question _locationQuestion{"place"};
+    Query _cellQuery{"cells"};
+    Query _locationQuery{"place"};
     int _partPolls = 0;                        ///< intervals until unreadable parts are retried
     bool _hadCells = false;                    ///< the last answer had cells
     std::optional<std::uint32_t> _earlierRate; ///< ModemManager's earlier rate; absent while it is unchanged

@@ -227,7 +227,7 @@ void LogServer::startStreaming(LogChannel& channel, const Dictionary& command) {
         channel.send(message);
 }
 
-void LogServer::take(const Data& message) {
+void LogServer::receive(const Data& message) {
     cacheExtra(message);
     // A channel may close on the way; none is added or removed.
     for (const ChannelRef& channel : _channels)

@@ -59,7 +59,7 @@ public:
 private:
     using ChannelRef = std::shared_ptr<LogChannel>;
 
-    void take(const Data& message) override;
+    void receive(const Data& message) override;
     [[nodiscard]] bool hasRoom() const override;
 
     [[nodiscard]] Value createChannel(const Data& request);

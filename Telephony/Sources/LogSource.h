@@ -15,7 +15,7 @@ class LogSink {
 public:
     virtual ~LogSink() = default;
     /// One log message, exactly as it is to arrive at the application's port.
-    virtual void take(const Data& message) = 0;
+    virtual void receive(const Data& message) = 0;
     /// False while a client that is worth waiting for still has much to take. A source that keeps a pace of
     /// its own sends on regardless; one that runs as fast as it can waits.
     [[nodiscard]] virtual bool hasRoom() const = 0;

@@ -88,7 +88,7 @@ void MessagePlayer::wake(const std::shared_ptr<Run>& run) {
         // Sending may stop the run.
         const auto offset_ns = static_cast<double>(run->event->offset.count());
         run->event.reset();
-        run->sink.take(message);
+        run->sink.receive(message);
         if (run->stopped)
             return;
         if (sent == batch - 1)

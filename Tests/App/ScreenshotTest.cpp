@@ -42,7 +42,7 @@ protected:
     }
     ~ScreenshotTest() override { setResources(&resources); }
 
-    void take(const Data& message) override {
+    void receive(const Data& message) override {
         static_cast<void>(platform.ports.deliver(logChannelPortName(), 0, message));
     }
     [[nodiscard]] bool hasRoom() const override { return true; }

@@ -109,7 +109,7 @@ TEST_F(LogServerTest, aChangedTechnologyClosesAllChannels) {
     const std::string streaming = createChannel("app");
     const std::string idle = createChannel("other");
     stream(streaming);
-    source.sink->take(record(0x0001, "01", 0xFF));
+    source.sink->receive(record(0x0001, "01", 0xFF));
     log.clear();
     source.spoken = kVoxLogChannelTechnology_Ostrel_LTE;
     source.changed();
@@ -142,7 +142,7 @@ TEST_F(LogServerTest, aChangeWhileAMessageIsOnItsWayEndsThatToo) {
         source.changed();
         return RemotePort::Answer{};
     });
-    source.sink->take(record(0x0001, "01", 0xFF));
+    source.sink->receive(record(0x0001, "01", 0xFF));
     queue.runPending();
     EXPECT_EQ(source.stops, 1);
     EXPECT_EQ(server.channelCount(), 0U);
@@ -162,7 +162,7 @@ TEST_F(LogServerTest, streamsWhatTheFilterPasses) {
     const Data malformed = hex("01 02 03");
     const Data sim = record(0x0000, "02", 0xFF);
     for (const Data& each : {wanted, record(0x5138, "01"), malformed, sim, record(0x0001, "02", 0xFF)})
-        source.sink->take(each);
+        source.sink->receive(each);
     EXPECT_THAT(sentTo("app"), ElementsAre(wanted, malformed, sim));
 }
 
@@ -173,8 +173,8 @@ TEST_F(LogServerTest, aNewStartCommandChangesTheFilterWithoutARestart) {
     const Value codes(std::make_shared<Array>(Array{2}));
     ASSERT_TRUE(ports.deliver(channel, 0, plist({{"SetState", "Streaming"}, {"SetOstrelLogCodes", codes}})));
     EXPECT_EQ(source.starts, 1);
-    source.sink->take(record(1, "00"));
-    source.sink->take(record(2, "00"));
+    source.sink->receive(record(1, "00"));
+    source.sink->receive(record(2, "00"));
     EXPECT_THAT(sentTo("app"), ElementsAre(record(2, "00")));
 }
 

@@ -19,7 +19,7 @@ namespace velmora {
 namespace {
 
 bool setsKey(const MemberRow& row) {
-    return row.use != MemberUse::Service && row.use != MemberUse::Nothing;
+    return row.use != MemberUse::Service && row.use != MemberUse::Unused;
 }
 
 TEST(MemberTableTest, everyRowIsComplete) {
