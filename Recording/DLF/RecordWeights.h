@@ -21,9 +21,9 @@ struct RecordWeights {
     int badTimestamp = -4;  ///< a time stamp that means no time
     int endOfInput = 12;    ///< a record that ends where the input ends
 
-    int goodFollower = 4; ///< least evidence at a record's end for the two to be linked
-    int expected = 8;     ///< least evidence for a record where one is expected
-    int sure = 20;        ///< least evidence, both ends together, for a record in the midst of damage
+    int goodFollower = 4; ///< least score at a record's end for the two to be linked
+    int expected = 8;     ///< least score for a record where one is expected
+    int sure = 20;        ///< least score, both ends together, for a record in the midst of damage
 };
 
 } // namespace velmora
