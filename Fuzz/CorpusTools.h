@@ -26,7 +26,7 @@ namespace velmora {
 }
 
 /// The byte, then the bytes: an input whose first byte chooses how the rest is taken.
-[[nodiscard]] inline Data behind(std::uint8_t first, Bytes rest) {
+[[nodiscard]] inline Data withFirstByte(std::uint8_t first, Bytes rest) {
     std::vector<std::uint8_t> bytes{first};
     bytes.insert(bytes.end(), rest.begin(), rest.end());
     return Data(std::move(bytes));

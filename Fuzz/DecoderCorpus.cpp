@@ -77,8 +77,8 @@ FuzzCorpus sameLabelsCorpus() {
         const FuzzCorpus decoder = decoderCorpus(fuzzedTechnologies[i].scenario);
         const std::size_t messages = decoder.seeds.size() / 2;
         for (std::size_t j = 0; j < messages; ++j)
-            corpus.seeds.push_back(behind(static_cast<std::uint8_t>(i),
-                                          joined(decoder.seeds[messages + j], decoder.seeds[j]).bytes()));
+            corpus.seeds.push_back(withFirstByte(
+                static_cast<std::uint8_t>(i), joined(decoder.seeds[messages + j], decoder.seeds[j]).bytes()));
         corpus.tokens.insert(corpus.tokens.end(), decoder.tokens.begin(), decoder.tokens.end());
     }
     return corpus;

@@ -90,7 +90,7 @@ FuzzCorpus templateCorpus() {
         std::vector<Data> forms;
         addBothForms(forms, templates[i]);
         for (const Data& form : forms)
-            corpus.seeds.push_back(behind(static_cast<std::uint8_t>(i), form.bytes()));
+            corpus.seeds.push_back(withFirstByte(static_cast<std::uint8_t>(i), form.bytes()));
     }
     return corpus;
 }

@@ -46,12 +46,12 @@ FuzzCorpus dlfCorpus() {
             const Value contents = savedContents(fuzzedTechnologies[i], perRedraw);
             const Array& entries = *contents.asArray();
             const Data* log = (*entries[entries.size() - 1].asDictionary())["DLF"].asData();
-            corpus.seeds.push_back(behind(static_cast<std::uint8_t>(perRedraw - 1), log->bytes()));
+            corpus.seeds.push_back(withFirstByte(static_cast<std::uint8_t>(perRedraw - 1), log->bytes()));
         }
     }
     for (const std::uint8_t begin :
          {LogMessage::basebandType, LogMessage::prefixMarker, LogMessage::extraType})
-        corpus.tokens.push_back(behind(begin, {}));
+        corpus.tokens.push_back(withFirstByte(begin, {}));
     corpus.tokens.emplace_back(std::vector<std::uint8_t>{0xA1, 0x00, 0xFD, 0x1F});
     return corpus;
 }
@@ -66,7 +66,7 @@ FuzzCorpus snapshotCorpus() {
         std::vector<Data> forms;
         addBothForms(forms, snapshot);
         for (const Data& form : forms)
-            corpus.seeds.push_back(behind(255, form.bytes()));
+            corpus.seeds.push_back(withFirstByte(255, form.bytes()));
     }
     for (const char* key :
          {"Timestamp", "Data", "Description", "DisplayState", "Display", "ExtraInfo", "Date", "DLF"})

@@ -62,15 +62,15 @@ FuzzCorpus frameCorpus() {
         for (const Data& message : messages) {
             std::vector<std::uint8_t> one;
             putFrame(one, {kind, true, -1, ++serial, message});
-            corpus.seeds.push_back(behind(3, one));
+            corpus.seeds.push_back(withFirstByte(3, one));
             all.insert(all.end(), one.begin(), one.end());
         }
     }
     putFrame(all, {FrameKind::Reply, false, 0, 7, {}});
     for (const std::uint8_t piece : std::initializer_list<std::uint8_t>{0, 15, 255})
-        corpus.seeds.push_back(behind(piece, all));
+        corpus.seeds.push_back(withFirstByte(piece, all));
     for (const std::uint8_t flags : std::initializer_list<std::uint8_t>{1, 2, 4, 10})
-        corpus.tokens.push_back(behind(flags, std::array<std::uint8_t, 3>{}));
+        corpus.tokens.push_back(withFirstByte(flags, std::array<std::uint8_t, 3>{}));
     return corpus;
 }
 
@@ -79,12 +79,12 @@ FuzzCorpus recordingCorpus() {
     const std::vector<Data> messages = someMessages();
     for (const bool bigEndian : {false, true}) {
         PcapngFile file(bigEndian);
-        corpus.seeds.push_back(behind(0, file.head().data().bytes()));
+        corpus.seeds.push_back(withFirstByte(0, file.head().data().bytes()));
         std::uint64_t stamp = 1'700'000'000'000'000'000;
         for (const Data& message : messages)
             file.message(++stamp, message.bytes());
-        corpus.seeds.push_back(behind(1, file.data().bytes()));
-        corpus.seeds.push_back(behind(2, mergedFile(bigEndian, messages).bytes()));
+        corpus.seeds.push_back(withFirstByte(1, file.data().bytes()));
+        corpus.seeds.push_back(withFirstByte(2, mergedFile(bigEndian, messages).bytes()));
         for (const std::uint32_t type : {0x0A0D0D0Au, 1u, 2u, 3u, 4u, 5u, 6u, 0x1A2B3C4Du})
             corpus.tokens.push_back(file.number(type, 4));
     }

@@ -14,8 +14,9 @@ namespace velmora {
 namespace {
 
 CLI::Validator validLogLevel() {
-    return wants([](const std::string& text) { return text.size() == 1 && text[0] >= '0' && text[0] <= '7'; },
-                 "a number from 0 to 7");
+    return validator(
+        [](const std::string& text) { return text.size() == 1 && text[0] >= '0' && text[0] <= '7'; },
+        "a number from 0 to 7");
 }
 
 std::string usageError(const CLI::App& app, const CLI::ParseError& error) {

@@ -8,16 +8,16 @@
 namespace velmora {
 
 void FaultLog::report(std::string_view subject, const std::string& text) {
-    std::string& told = _reported[std::string(subject)];
-    if (told == text)
+    std::string& last = _reported[std::string(subject)];
+    if (last == text)
         return;
-    told = text;
+    last = text;
     logFormat(LogPriority::Warning, "modemmanager: %s", text.c_str());
 }
 
 void FaultLog::clear(std::string_view subject) {
-    if (const auto told = _reported.find(subject); told != _reported.end())
-        _reported.erase(told);
+    if (const auto last = _reported.find(subject); last != _reported.end())
+        _reported.erase(last);
 }
 
 } // namespace velmora

@@ -23,16 +23,16 @@ Result<std::unique_ptr<ReplaySource>> ReplaySource::create(MainQueue& queue, con
     auto reader = open();
     if (!reader)
         return Failure{name + ": " + reader.reason()};
-    // A file may tell its technology only by its messages.
+    // Some files have no technology until the first messages are read.
     if ((*reader)->technology().empty())
         static_cast<void>((*reader)->next());
     if ((*reader)->failure())
         return Failure{name + ": " + (*reader)->failure()->reason};
-    const std::string& told = options.technology.empty() ? (*reader)->technology() : options.technology;
-    if (told.empty())
+    const std::string& named = options.technology.empty() ? (*reader)->technology() : options.technology;
+    if (named.empty())
         return Failure{name + ": the file does not say which technology its messages are of; technology=NAME "
                               "supplies it"};
-    std::string technology = technologyConstant(told);
+    std::string technology = technologyConstant(named);
     return std::unique_ptr<ReplaySource>(
         new ReplaySource(queue, clock, std::move(name), std::move(technology), std::move(open), options));
 }

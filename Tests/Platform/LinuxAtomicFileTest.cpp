@@ -27,11 +27,11 @@ using IfExists = AtomicFile::IfExists;
 class LinuxAtomicFileTest : public testing::Test {
 protected:
     [[nodiscard]] AtomicFile create(const std::string& name, const std::string& content) const {
-        Result<AtomicFile> draft = AtomicFile::create(directory / name, 0666);
-        EXPECT_TRUE(draft) << draft.reason();
-        EXPECT_TRUE(writeAll(draft->descriptor(),
+        Result<AtomicFile> file = AtomicFile::create(directory / name, 0666);
+        EXPECT_TRUE(file) << file.reason();
+        EXPECT_TRUE(writeAll(file->descriptor(),
                              Bytes(reinterpret_cast<const std::uint8_t*>(content.data()), content.size())));
-        return *std::move(draft);
+        return *std::move(file);
     }
     [[nodiscard]] std::string content(const std::string& name) const {
         std::ifstream file(directory / name);
@@ -48,57 +48,57 @@ protected:
 };
 
 TEST_F(LinuxAtomicFileTest, ReplacesTheTargetOnCommit) {
-    AtomicFile draft = create("out", "text");
-    EXPECT_EQ(std::filesystem::path(draft.path()).parent_path(), directory.path()) << "on the same disk";
+    AtomicFile file = create("out", "text");
+    EXPECT_EQ(std::filesystem::path(file.path()).parent_path(), directory.path()) << "on the same disk";
     EXPECT_EQ(names().size(), 1U);
     EXPECT_FALSE(std::filesystem::exists(directory / "out"));
-    ASSERT_TRUE(draft.publish(IfExists::Refuse));
+    ASSERT_TRUE(file.commit(IfExists::Refuse));
     EXPECT_EQ(content("out"), "text");
     EXPECT_THAT(names(), ElementsAre("out"));
 }
 
 TEST_F(LinuxAtomicFileTest, IsRemovedUnlessItIsPublished) {
     {
-        const AtomicFile draft = create("out", "text");
+        const AtomicFile file = create("out", "text");
         EXPECT_EQ(names().size(), 1U);
     }
     EXPECT_THAT(names(), ElementsAre());
-    AtomicFile draft = create("out", "text");
-    const AtomicFile moved = std::move(draft);
-    draft.discard(); // NOLINT(bugprone-use-after-move) which is what is tested
+    AtomicFile file = create("out", "text");
+    const AtomicFile moved = std::move(file);
+    file.discard(); // NOLINT(bugprone-use-after-move) which is what is tested
     EXPECT_EQ(names().size(), 1U) << "the other one has it";
 }
 
 TEST_F(LinuxAtomicFileTest, ReplacesOrRefuses) {
     std::ofstream(directory / "out") << "earlier";
     AtomicFile refused = create("out", "text");
-    const auto result = refused.publish(IfExists::Refuse);
+    const auto result = refused.commit(IfExists::Refuse);
     ASSERT_FALSE(result);
     EXPECT_EQ(result.reason(), "cannot be replaced: File exists");
     EXPECT_EQ(content("out"), "earlier");
     EXPECT_THAT(names(), ElementsAre("out"));
-    ASSERT_TRUE(create("out", "text").publish(IfExists::Replace));
+    ASSERT_TRUE(create("out", "text").commit(IfExists::Replace));
     EXPECT_EQ(content("out"), "text");
     EXPECT_THAT(names(), ElementsAre("out"));
 }
 
 TEST_F(LinuxAtomicFileTest, HasThePermissionsOfTheFileOrTheUsualOnes) {
     const mode_t earlier = ::umask(0027);
-    ASSERT_TRUE(create("new", "").publish(IfExists::Refuse));
+    ASSERT_TRUE(create("new", "").commit(IfExists::Refuse));
     ::umask(earlier);
     EXPECT_EQ(std::filesystem::status(directory / "new").permissions(), std::filesystem::perms(0640));
     std::filesystem::permissions(directory / "new", std::filesystem::perms(0604));
-    ASSERT_TRUE(create("new", "").publish(IfExists::Replace));
+    ASSERT_TRUE(create("new", "").commit(IfExists::Replace));
     EXPECT_EQ(std::filesystem::status(directory / "new").permissions(), std::filesystem::perms(0604));
 }
 
 TEST_F(LinuxAtomicFileTest, ReportsAnUnusableDirectory) {
-    const auto draft = AtomicFile::create(directory / "none/out", 0666);
-    ASSERT_FALSE(draft);
-    EXPECT_EQ(draft.reason(), "cannot be opened for writing: No such file or directory");
+    const auto file = AtomicFile::create(directory / "none/out", 0666);
+    ASSERT_FALSE(file);
+    EXPECT_EQ(file.reason(), "cannot be opened for writing: No such file or directory");
     std::filesystem::create_directories(directory / "taken/by");
     AtomicFile overDirectory = create("taken", "text");
-    const auto result = overDirectory.publish(IfExists::Replace);
+    const auto result = overDirectory.commit(IfExists::Replace);
     ASSERT_FALSE(result);
     EXPECT_EQ(result.reason(), "cannot be replaced: Is a directory");
     EXPECT_THAT(names(), UnorderedElementsAre("taken"));

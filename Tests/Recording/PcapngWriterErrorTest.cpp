@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Tests/Recording/RecordingTroubleFixture.h"
+#include "Tests/Recording/PcapngWriterFixture.h"
 
 #include <cerrno>
 #include <string>
@@ -14,7 +14,7 @@ namespace {
 
 using testing::ElementsAre;
 
-using PcapngWriterErrorTest = RecordingTroubleFixture;
+using PcapngWriterErrorTest = PcapngWriterFixture;
 
 TEST_F(PcapngWriterErrorTest, FullDiskKeepsCompleteBlocksAndContinuesWithoutAGap) {
     start();

@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Tests/Recording/RecordingTroubleFixture.h"
+#include "Tests/Recording/PcapngWriterFixture.h"
 
 #include <cerrno>
 #include <vector>
@@ -13,7 +13,7 @@ namespace {
 
 using testing::ElementsAre;
 
-using RecordingSyncTest = RecordingTroubleFixture;
+using RecordingSyncTest = PcapngWriterFixture;
 
 TEST_F(RecordingSyncTest, SyncIsStartedForWhatIsNewAndOneAtATime) {
     start();

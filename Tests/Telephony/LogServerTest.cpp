@@ -114,7 +114,7 @@ TEST_F(LogServerTest, aChangedTechnologyClosesAllChannels) {
     source.spoken = kVoxLogChannelTechnology_Ostrel_LTE;
     source.changed();
     EXPECT_FALSE(ports.isTaken(streaming));
-    EXPECT_FALSE(ports.isTaken(idle)) << "its client has been told the old technology";
+    EXPECT_FALSE(ports.isTaken(idle)) << "its client was given the old technology";
     EXPECT_EQ(ports.connectionCount("app"), 0U);
     EXPECT_THAT(log.textsAt(LogPriority::Notice),
                 ElementsAre(streaming + ": closed, the technology is Ostrel_LTE now",

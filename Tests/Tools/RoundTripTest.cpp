@@ -49,7 +49,7 @@ std::string textOf(const Value& display) {
 class ShownRefreshes final : public DecodingObserver {
 public:
     std::vector<Shown> all;
-    void refreshed(Time tick, const Decoded& decoded) override {
+    void didRefresh(Time tick, const Decoded& decoded) override {
         all.push_back({tick, textOf(decoded.display)});
     }
 };
@@ -140,7 +140,7 @@ TEST_P(RoundTripTest, SnapshotShowsTheLastFiveRefreshes) {
     std::vector<Refresh> refreshes(1);
     RefreshTicks ticks;
     for (const TimedMessage& message : _drive) {
-        if (const auto tick = ticks.before(message.time)) {
+        if (const auto tick = ticks.tickBefore(message.time)) {
             refreshes.back().tick = *tick;
             refreshes.emplace_back();
         }

@@ -45,7 +45,7 @@ void ModalPresentation::present(bool animated) {
     _sheet->raise();
     if (!_viewController->becomeFirstResponder())
         _sheet->focusFirst();
-    _motion.start(
+    _animation.start(
         animated,
         [this](double part) {
             _shown = part;
@@ -55,7 +55,7 @@ void ModalPresentation::present(bool animated) {
 }
 
 void ModalPresentation::dismiss(bool animated) {
-    _motion.finish();
+    _animation.finish();
     _viewController->viewWillDisappear(animated);
     if (!_sheet) {
         _viewController->viewDidDisappear(animated);
@@ -64,7 +64,7 @@ void ModalPresentation::dismiss(bool animated) {
     _sheet->setPassive();
     if (_window)
         _window->returnFocus(_focusBefore);
-    _motion.start(
+    _animation.start(
         animated,
         [this](double part) {
             _shown = 1 - part;

@@ -5,7 +5,7 @@
 
 #include "Toolkit/Navigation/ViewController.h"
 #include "Toolkit/View.h"
-#include "Toolkit/Widgets/Motion.h"
+#include "Toolkit/Widgets/Animation.h"
 #include "Toolkit/Widgets/SheetWidget.h"
 #include "Toolkit/Widgets/WindowWidget.h"
 
@@ -38,7 +38,7 @@ private:
     QPointer<WindowWidget> _window;
     QPointer<SheetWidget> _sheet;
     QPointer<QWidget> _focusBefore;
-    Motion _motion;
+    Animation _animation;
     double _shown = 0;
 };
 

@@ -4,8 +4,8 @@
 #pragma once
 
 #include "Toolkit/View.h"
+#include "Toolkit/Widgets/Animation.h"
 #include "Toolkit/Widgets/HeaderBar.h"
-#include "Toolkit/Widgets/Motion.h"
 #include "Toolkit/Widgets/Toolbar.h"
 
 namespace velmora {
@@ -39,7 +39,7 @@ private:
     View* _pane = nullptr;
     View* _old = nullptr;
     bool _isPush = true;
-    Motion _motion;
+    Animation _animation;
 };
 
 } // namespace velmora

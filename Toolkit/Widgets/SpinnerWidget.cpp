@@ -3,7 +3,7 @@
 
 #include "Toolkit/Widgets/SpinnerWidget.h"
 
-#include "Toolkit/Widgets/Motion.h"
+#include "Toolkit/Widgets/Animation.h"
 
 #include <QPainter>
 

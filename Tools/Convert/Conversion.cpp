@@ -118,8 +118,8 @@ public:
         return !_expected || refreshes + kept >= *_expected;
     }
     [[nodiscard]] bool wantsEveryRefresh() const override { return false; }
-    void refreshed(Time refreshTick, const Decoded&) override { tick = refreshTick; }
-    void ended(const LogGenerator& decoder, const Dictionary& state) override {
+    void didRefresh(Time refreshTick, const Decoded&) override { tick = refreshTick; }
+    void didFinish(const LogGenerator& decoder, const Dictionary& state) override {
         contents = decoder.getSaveContentsFromState(state);
     }
 

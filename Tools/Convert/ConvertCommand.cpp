@@ -88,19 +88,19 @@ std::optional<std::uint64_t> refreshesOf(const std::string& file) {
 
 /// Whether all of the input is in the output now.
 bool convert(const ConvertOptions& options, MessageReader& reader, const std::string& title) {
-    // Before the draft, so that an allocation that fails never leaves one on the disk.
+    // Before the output, so that an allocation that fails never leaves one on the disk.
     AtomicFile* made = nullptr;
     WorkContext context(title, [&made] {
         if (made)
             made->discard();
     });
-    Result<AtomicFile> draft = AtomicFile::create(options.out, newFileMode);
-    if (!draft) {
-        report(options.out + ": " + draft.reason());
+    Result<AtomicFile> output = AtomicFile::create(options.out, newFileMode);
+    if (!output) {
+        report(options.out + ": " + output.reason());
         return false;
     }
-    made = &*draft;
-    const RemovedWhenInterrupted removed(draft->path());
+    made = &*output;
+    const RemovedWhenInterrupted removed(output->path());
     Conversion conversion;
     conversion.form = *formFromName(options.out);
     conversion.title = title;
@@ -109,16 +109,16 @@ bool convert(const ConvertOptions& options, MessageReader& reader, const std::st
     conversion.description = options.description;
     if (conversion.form == FileForm::Snapshot)
         conversion.refreshes = refreshesOf(options.file);
-    const Result<bool> converted = convertMessages(reader, conversion, draft->descriptor(), context);
+    const Result<bool> converted = convertMessages(reader, conversion, output->descriptor(), context);
     if (!converted) {
         report(converted.reason());
         return false;
     }
     using IfExists = AtomicFile::IfExists;
-    const auto published = draft->publish(options.force ? IfExists::Replace : IfExists::Refuse);
-    if (!published)
-        report(options.out + ": " + published.reason());
-    return published && *converted;
+    const auto committed = output->commit(options.force ? IfExists::Replace : IfExists::Refuse);
+    if (!committed)
+        report(options.out + ": " + committed.reason());
+    return committed && *converted;
 }
 
 } // namespace

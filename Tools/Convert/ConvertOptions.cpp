@@ -19,8 +19,8 @@ CLI::App* addConvert(CLI::App& app, ConvertOptions& options) {
                      "The output; its suffix selects the form: .pcapng a recording, .velmora a snapshot, "
                      ".dlf a DLF log")
         ->required()
-        ->check(wants([](const std::string& name) { return formFromName(name).has_value(); },
-                      std::string("a name that ends in ") + formSuffixes))
+        ->check(validator([](const std::string& name) { return formFromName(name).has_value(); },
+                          std::string("a name that ends in ") + formSuffixes))
         ->type_name("");
     command->add_flag("--force", options.force, "Overwrite OUT if it exists");
     addTechnology(*command, options.technology, "Convert as");

@@ -22,10 +22,10 @@ void CSVRows::didDecode(const LoggedMessage& message, LogGenerator& decoder, Dic
         writeRow(message.time, decoder.display(state));
 }
 
-void CSVRows::refreshed(Time tick, const Decoded& decoded) {
+void CSVRows::didRefresh(Time tick, const Decoded& decoded) {
     if (_options.every == DecodeOptions::Every::Refresh)
         writeRow(tick, decoded.display);
-    LineWriter::refreshed(tick, decoded);
+    LineWriter::didRefresh(tick, decoded);
 }
 
 std::string CSVRows::header(const DecodeOptions& options) {

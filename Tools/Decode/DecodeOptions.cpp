@@ -83,7 +83,7 @@ CLI::App* addDecode(CLI::App& app, DecodeOptions& options) {
             "Only this part of the display, by a path of the names on the screens: \"/GSM/GSM Serving "
             "Cell/RSSI\", "
             "\"/GSM/Neighboring Cells/0\"; may be repeated")
-        ->check(wants(NodeSelection::isPath, "a path that begins with a slash"))
+        ->check(validator(NodeSelection::isPath, "a path that begins with a slash"))
         ->expected(1)
         ->allow_extra_args(false) // a FILE may follow
         ->multi_option_policy(CLI::MultiOptionPolicy::TakeAll)

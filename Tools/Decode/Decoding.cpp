@@ -42,7 +42,7 @@ Result<Decoded> decodeMessages(MessageReader& reader, const DecodingRequest& req
         // A refresh that nobody sees does nothing but, where there is no display yet, log why.
         if (keepsHistory || wantsEveryRefresh || !state.contains("Display"))
             decoded.display = (*decoder)->generateLogUsingState(state);
-        observer.refreshed(tick, decoded);
+        observer.didRefresh(tick, decoded);
         if (observer.wantsHistory(refreshes.count()) != keepsHistory) {
             keepsHistory = !keepsHistory;
             (*decoder)->setKeepsHistory(keepsHistory);
@@ -87,7 +87,7 @@ Result<Decoded> decodeMessages(MessageReader& reader, const DecodingRequest& req
         refresh(*tick);
     if (refreshes.count() != 0 && !keepsHistory && !wantsEveryRefresh)
         decoded.display = (*decoder)->display(state);
-    observer.ended(**decoder, state);
+    observer.didFinish(**decoder, state);
     if (!resources.failure().empty())
         return Failure{"decoded without its template: " + resources.failure()};
     return decoded;

@@ -46,9 +46,9 @@ public:
     /// A wanted message has been decoded; `decoder.display(state)` is the display as it then stands.
     virtual void didDecode(const LoggedMessage&, LogGenerator& /*decoder*/, Dictionary& /*state*/) {}
     /// Called after a refresh; `decoded` holds the display and the result so far.
-    virtual void refreshed(Time /*tick*/, const Decoded& /*decoded*/) {}
+    virtual void didRefresh(Time /*tick*/, const Decoded& /*decoded*/) {}
     /// Called after the last refresh, with the final state.
-    virtual void ended(const LogGenerator& /*decoder*/, const Dictionary& /*state*/) {}
+    virtual void didFinish(const LogGenerator& /*decoder*/, const Dictionary& /*state*/) {}
     /// Whether decoding may stop here; asked after every message.
     [[nodiscard]] virtual bool isDone() const { return false; }
 };

@@ -14,7 +14,7 @@ namespace velmora {
 class RefreshLines final : public LineWriter {
 public:
     RefreshLines(Output& output, bool isLive, const NodeSelection& selection, const std::string& file);
-    void refreshed(Time tick, const Decoded& decoded) override;
+    void didRefresh(Time tick, const Decoded& decoded) override;
 
 private:
     const NodeSelection& _selection;

@@ -8,7 +8,7 @@
 namespace velmora {
 
 /// Precondition: this is the first message, or the next tick is not after it.
-std::optional<Time> RefreshTicks::reach(Time message) {
+std::optional<Time> RefreshTicks::advanceTo(Time message) {
     if (!_started) {
         _started = true;
         _next = message;

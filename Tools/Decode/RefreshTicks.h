@@ -29,16 +29,16 @@ public:
     static constexpr std::chrono::nanoseconds interval = std::chrono::seconds(2);
 
     /// A message with this time stamp comes next. Returns the tick that refreshes before it, if any.
-    [[nodiscard]] std::optional<Time> before(Time message) {
+    [[nodiscard]] std::optional<Time> tickBefore(Time message) {
         if (_started && (_exhausted || message < _next))
             return std::nullopt;
-        return reach(message);
+        return advanceTo(message);
     }
     /// The last tick, which follows the last message; none where there was no message.
     [[nodiscard]] std::optional<Time> last() const;
 
 private:
-    [[nodiscard]] std::optional<Time> reach(Time message);
+    [[nodiscard]] std::optional<Time> advanceTo(Time message);
     void advancePast(Time message);
 
     bool _started = false;

@@ -18,13 +18,13 @@ class Refreshes {
 public:
     /// The refresh that is due before this message is decoded, if any.
     [[nodiscard]] std::optional<Time> before(const LoggedMessage& message) {
-        _fileTells = _fileTells || message.refresh;
-        const std::optional<Time> tick = _ticks.before(message.time);
-        return tick && !_fileTells ? tick : std::nullopt;
+        _fileHasRefreshes = _fileHasRefreshes || message.refresh;
+        const std::optional<Time> tick = _ticks.tickBefore(message.time);
+        return tick && !_fileHasRefreshes ? tick : std::nullopt;
     }
     /// The message, which is not decoded, is passed over: the refresh that is due after it, if any.
     [[nodiscard]] std::optional<Time> afterSkipped(const LoggedMessage& message) {
-        _fileTells = _fileTells || message.refresh;
+        _fileHasRefreshes = _fileHasRefreshes || message.refresh;
         return _isPending ? message.refresh : std::nullopt;
     }
     /// The message has been decoded: the refresh that is due after it, if any.
@@ -44,8 +44,8 @@ public:
 
 private:
     RefreshTicks _ticks;
-    bool _fileTells = false; ///< and then its refreshes are all there are
-    bool _isPending = false; ///< a message has been decoded since the last refresh
+    bool _fileHasRefreshes = false; ///< and then its refreshes are all there are
+    bool _isPending = false;        ///< a message has been decoded since the last refresh
     std::uint64_t _count = 0;
 };
 

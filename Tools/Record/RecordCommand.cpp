@@ -22,7 +22,7 @@ int sumUp(const RecordingSession& recording, const std::string& file, int status
            recording.technology() + ", " + std::to_string(recording.bytes() - unsaved.bytes) + " bytes");
     const std::uint64_t missing = unsaved.messages + recording.dropped();
     // A pipe's reader that has closed it does not miss messages.
-    if (missing == 0 || recording.hasLostReader())
+    if (missing == 0 || recording.hasClosedReader())
         return status;
     report(std::to_string(missing) + " messages are missing from " + file);
     return ExitStatus::BadInput;
@@ -47,7 +47,7 @@ int runRecord(const RecordOptions& options) {
     ServiceClient client;
     int status = Recorder(options, recording, client).run();
     if (const Result<Done> closed = recording.close();
-        !closed && status == ExitStatus::Done && !recording.hasLostReader()) {
+        !closed && status == ExitStatus::Done && !recording.hasClosedReader()) {
         report(closed.reason());
         status = ExitStatus::BadInput;
     }

@@ -11,7 +11,7 @@ namespace {
 
 /// At most what the event loop's timers hold, which is 24 days.
 CLI::Validator validSeconds() {
-    return wants(
+    return validator(
         [](const std::string& text) {
             double seconds = 0;
             return CLI::detail::lexical_cast(text, seconds) && seconds >= 0.001 && seconds <= 2e6;

@@ -73,7 +73,7 @@ bool Recorder::learn(std::string_view technology, bool hasDecoder) {
     if (!check(_session.setTechnology(technology)))
         return false;
     if (std::exchange(_gone, false))
-        _news.tell(std::string(serviceTitle) + " is back");
+        _news.notify(std::string(serviceTitle) + " is back");
     _streaming = true;
     return true;
 }
@@ -90,14 +90,14 @@ void Recorder::save() {
     if (_ended)
         return;
     checkService();
-    if (_session.hasLostReader())
+    if (_session.hasClosedReader())
         end(ExitStatus::Done);
-    else if (_session.trouble().empty())
+    else if (_session.temporaryError().empty())
         static_cast<void>(check(_session.save()));
 }
 
 void Recorder::retry() {
-    if (!_ended && !_session.trouble().empty())
+    if (!_ended && !_session.temporaryError().empty())
         static_cast<void>(check(_session.save()));
     if (!_ended)
         showProgress();
@@ -114,7 +114,7 @@ void Recorder::checkService() {
 
 void Recorder::serviceIsGone() {
     _gone = true;
-    _news.tell(std::string(serviceTitle) + " is gone; waiting for it");
+    _news.notify(std::string(serviceTitle) + " is gone; waiting for it");
 }
 
 /// Ends the recording on a failure, after reporting it. Returns whether there was none.
@@ -123,11 +123,11 @@ bool Recorder::check(const Result<Done>& result) {
         _news.reportWriteError();
         return true;
     }
-    if (_session.hasLostReader()) {
+    if (_session.hasClosedReader()) {
         end(ExitStatus::Done);
         return false;
     }
-    _news.tell(result.reason());
+    _news.notify(result.reason());
     end(ExitStatus::BadInput);
     return false;
 }

@@ -20,7 +20,7 @@ public:
     RecordingNews(const RecordingSession& session, std::string file, Time started);
 
     /// A message that the user must get even without looking at the terminal: it goes to the log as well.
-    void tell(const std::string& text);
+    void notify(const std::string& text);
     /// Tells each change once: trouble that has come up, messages for which there is no room, trouble that
     /// has passed.
     void reportWriteError();

@@ -71,7 +71,7 @@ Result<Done> RecordingSession::setTechnology(std::string_view technology) {
     if (_writer)
         return Done{};
     // A file that is to be overwritten stays as it is until the new one has its head.
-    std::optional<AtomicFile> draft;
+    std::optional<AtomicFile> file;
     if (isFilledFile(_file.get())) {
         std::error_code error;
         std::filesystem::path place = std::filesystem::canonical(_path, error); // a symbolic link stays one
@@ -80,10 +80,10 @@ Result<Done> RecordingSession::setTechnology(std::string_view technology) {
         Result<AtomicFile> made = AtomicFile::create(place, newFileMode);
         if (!made)
             return Failure{_path + ": " + made.reason()};
-        draft.emplace(*std::move(made));
+        file.emplace(*std::move(made));
     }
     // The writer closes its descriptor, and so gets one of its own.
-    const int descriptor = draft ? draft->descriptor() : _file.get();
+    const int descriptor = file ? file->descriptor() : _file.get();
     const int copy = _path == "-" ? -1 : ::fcntl(descriptor, F_DUPFD_CLOEXEC, 0);
     if (_path != "-" && copy < 0)
         return Failure{"cannot write " + _path + ": " + std::generic_category().message(errno)};
@@ -92,11 +92,11 @@ Result<Done> RecordingSession::setTechnology(std::string_view technology) {
     _file.reset();
     if (!writer)
         return Failure{writer.reason()};
-    if (draft) {
+    if (file) {
         if (Result<Done> written = (*writer)->flush(); !written) // the head may be waiting
             return written;
-        if (const Result<Done> published = draft->publish(AtomicFile::IfExists::Replace); !published)
-            return Failure{_path + ": " + published.reason()};
+        if (const Result<Done> committed = file->commit(AtomicFile::IfExists::Replace); !committed)
+            return Failure{_path + ": " + committed.reason()};
     }
     _writer = *std::move(writer);
     _technology = name;
@@ -132,7 +132,7 @@ Result<Done> RecordingSession::close() {
     return _writer->close();
 }
 
-bool RecordingSession::hasLostReader() const {
+bool RecordingSession::hasClosedReader() const {
     pollfd watched{STDOUT_FILENO, 0, 0};
     return _path == "-" && ::poll(&watched, 1, 0) > 0 && (watched.revents & POLLERR) != 0;
 }

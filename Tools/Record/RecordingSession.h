@@ -54,11 +54,11 @@ public:
     /// Messages dropped while the file could not be written.
     [[nodiscard]] std::uint64_t dropped() const { return _writer ? _writer->droppedMessages() : 0; }
     /// The temporary error; empty when there is none. Messages are queued meanwhile.
-    [[nodiscard]] const std::string& trouble() const { return _temporaryError; }
+    [[nodiscard]] const std::string& temporaryError() const { return _temporaryError; }
     /// Whether the queue is full.
     [[nodiscard]] bool isDropping() const { return _writer && _writer->isDropping(); }
     /// Whether the recording goes to a pipe whose reader has closed it.
-    [[nodiscard]] bool hasLostReader() const;
+    [[nodiscard]] bool hasClosedReader() const;
     /// Removes the file that this has created, if it is still empty: for a program that ends without
     /// destructors. Allocates nothing.
     void removeIfEmpty() const;

@@ -23,7 +23,7 @@ void LineWriter::endLine(std::string_view end) {
     _complete = 0;
 }
 
-void LineWriter::refreshed(Time, const Decoded&) {
+void LineWriter::didRefresh(Time, const Decoded&) {
     if (_isLive)
         flush();
 }

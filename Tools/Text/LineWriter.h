@@ -17,7 +17,7 @@ namespace velmora {
 /// written out.
 class LineWriter : public DecodeWriter {
 public:
-    void refreshed(Time tick, const Decoded& decoded) override;
+    void didRefresh(Time tick, const Decoded& decoded) override;
     void flush() override;
     void finish(const Decoded&) override { flush(); }
 

@@ -65,7 +65,7 @@ public:
     int run() {
         const WorkContext context(serviceTitle, [this] {
             _model->destroyPorts();
-            _view->leave();
+            _view->restoreTerminal();
         });
         const SignalWatcher signals([this](int) { _client.loop.quit(ExitStatus::Done); });
         _client.queue.async([this] { _model->restartMonitor(); });

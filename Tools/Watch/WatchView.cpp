@@ -39,7 +39,7 @@ void ScreenView::showStatus(const std::string& status) {
     draw();
 }
 
-void ScreenView::leave() {
+void ScreenView::restoreTerminal() {
     _terminal.restore();
     if (_deferredLog)
         _deferredLog->release();

@@ -26,7 +26,7 @@ public:
     /// Whether there is still a reader or a terminal.
     [[nodiscard]] virtual bool isOpen() const = 0;
     /// Restores the terminal, if one is in use.
-    virtual void leave() {}
+    virtual void restoreTerminal() {}
 };
 
 /// Prints each refresh after its status line, a blank line between two.
@@ -35,7 +35,7 @@ public:
     explicit PipeView(Output& output) : _output(output) {}
     void showRefresh(const std::string& status, std::vector<TreeRow> rows) override;
     void showStatus(const std::string& status) override;
-    [[nodiscard]] bool isOpen() const override { return _output.isOpen() && !_output.hasLostReader(); }
+    [[nodiscard]] bool isOpen() const override { return _output.isOpen() && !_output.hasClosedReader(); }
 
 private:
     Output& _output;
@@ -51,7 +51,7 @@ public:
     void showRefresh(const std::string& status, std::vector<TreeRow> rows) override;
     void showStatus(const std::string& status) override;
     [[nodiscard]] bool isOpen() const override { return true; }
-    void leave() override;
+    void restoreTerminal() override;
 
 private:
     void handleInput(std::string_view bytes);

@@ -42,18 +42,18 @@ bool rename(const std::string& from, const std::filesystem::path& to, AtomicFile
 } // namespace
 
 Result<AtomicFile> AtomicFile::create(const std::filesystem::path& target, mode_t mode) {
-    // Once the file exists nothing here may throw until the draft owns it: the file would be left over.
+    // Once the file exists nothing here may throw until the object owns it: the file would be left over.
     std::string path = target.string() + ".XXXXXX";
-    AtomicFile draft(target, {}, {});
-    draft._file = FileDescriptor(::mkostemp(path.data(), O_CLOEXEC));
-    if (!draft._file)
+    AtomicFile file(target, {}, {});
+    file._file = FileDescriptor(::mkostemp(path.data(), O_CLOEXEC));
+    if (!file._file)
         return Failure{"cannot be opened for writing: " + errnoText(errno)};
-    draft._path = std::move(path);
+    file._path = std::move(path);
     struct stat earlier = {};
     const bool existed = ::stat(target.c_str(), &earlier) == 0;
-    if (::fchmod(draft.descriptor(), existed ? earlier.st_mode & 07777 : mode & ~maskOfProcess()) != 0)
+    if (::fchmod(file.descriptor(), existed ? earlier.st_mode & 07777 : mode & ~maskOfProcess()) != 0)
         return Failure{"cannot be given its permissions: " + errnoText(errno)};
-    return draft;
+    return file;
 }
 
 AtomicFile::AtomicFile(std::filesystem::path target, std::string path, FileDescriptor file)
@@ -63,7 +63,7 @@ AtomicFile::AtomicFile(AtomicFile&& other) noexcept
     : _target(std::move(other._target)), _path(std::exchange(other._path, {})),
       _file(std::move(other._file)) {}
 
-Result<Done> AtomicFile::publish(IfExists choice) {
+Result<Done> AtomicFile::commit(IfExists choice) {
     // The content is on the disk before the name leads to it.
     if (::fsync(_file.get()) != 0 || !rename(_path, _target, choice)) {
         const Failure failure{"cannot be replaced: " + errnoText(errno)};

@@ -13,8 +13,8 @@
 
 namespace velmora {
 
-/// A file in the making: it is written beside the one whose place it takes in the end, in one step, so that a
-/// failure leaves what was there and no part of it is ever visible. A draft that is not published is removed.
+/// A file that is written under a temporary name in its target's directory and renamed when complete, so that
+/// a failure leaves the old file and a partial one is never visible. A file that is not committed is removed.
 /// Reasons are ready to follow "file: ".
 class AtomicFile {
 public:
@@ -33,7 +33,7 @@ public:
 
     /// Syncs the content to storage and renames it. The temporary file is gone afterwards, whatever the
     /// outcome.
-    Result<Done> publish(IfExists choice);
+    Result<Done> commit(IfExists choice);
     /// Removes the temporary file.
     void discard();
 

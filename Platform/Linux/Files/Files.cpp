@@ -64,12 +64,12 @@ Result<Done> writeFile(const std::filesystem::path& path, Bytes content) {
 }
 
 Result<Done> replaceFile(const std::filesystem::path& path, Bytes content) {
-    Result<AtomicFile> draft = AtomicFile::create(path, S_IRUSR | S_IWUSR);
-    if (!draft)
-        return Failure{draft.reason()};
-    if (auto written = writeAll(draft->descriptor(), content); !written)
+    Result<AtomicFile> file = AtomicFile::create(path, S_IRUSR | S_IWUSR);
+    if (!file)
+        return Failure{file.reason()};
+    if (auto written = writeAll(file->descriptor(), content); !written)
         return written;
-    return draft->publish(AtomicFile::IfExists::Replace);
+    return file->commit(AtomicFile::IfExists::Replace);
 }
 
 } // namespace velmora

@@ -68,7 +68,7 @@ TEST_F(AskingTest, nothingIsRequestedWithoutAListener) {
     listen();
     EXPECT_TRUE(comes([this] { return mock.count("GetCellInfo") == 1; }));
     sink.messages.clear();
-    EXPECT_TRUE(passes([&] { return count(simCode) > 0 && count(contextCode) > 0; })) << "told anew";
+    EXPECT_TRUE(passes([&] { return count(simCode) > 0 && count(contextCode) > 0; })) << "sent again";
 }
 
 TEST_F(AskingTest, cellsAreAskedEveryThreeSecondsAndNeverTwiceAtATime) {
@@ -81,7 +81,7 @@ TEST_F(AskingTest, cellsAreAskedEveryThreeSecondsAndNeverTwiceAtATime) {
         drain();
         EXPECT_EQ(mock.count("GetCellInfo"), turn - 1);
         queue.advance(1ms);
-        ASSERT_TRUE(comes([&] { return count(cellCode) == turn; })) << "each measurement is told";
+        ASSERT_TRUE(comes([&] { return count(cellCode) == turn; })) << "each measurement is sent";
     }
     mock.held = "GetCellInfo";
     queue.advance(3s);

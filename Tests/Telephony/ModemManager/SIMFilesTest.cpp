@@ -28,12 +28,12 @@ TEST_F(SIMFilesTest, theSIMsFilesAreShown) {
     putModem({{"OwnNumbers", QStringList{"+15550100", "+15550101"}}});
     follow();
     listen();
-    EXPECT_TRUE(
-        tells(simCode, dictionary({{"kSimFile_ICCID", "89011010000000000017"},
-                                   {"kSimFile_AHPLMN", "001-01"},
-                                   {"kSimFile_PNN", "Test Network"},
-                                   {"kSimFile_OPLMNAcT", "001-02 (LTE), 310-260 (GSM, GPRS, UMTS), 999-99"},
-                                   {"kSimFile_MSISDN", "+15550100, +15550101"}})));
+    EXPECT_TRUE(receives(simCode,
+                         dictionary({{"kSimFile_ICCID", "89011010000000000017"},
+                                     {"kSimFile_AHPLMN", "001-01"},
+                                     {"kSimFile_PNN", "Test Network"},
+                                     {"kSimFile_OPLMNAcT", "001-02 (LTE), 310-260 (GSM, GPRS, UMTS), 999-99"},
+                                     {"kSimFile_MSISDN", "+15550100, +15550101"}})));
     EXPECT_EQ(at(display("LTE"), {"SIM Info"}),
               dictionary({{"EF-ICCID", "89011010000000000017"},
                           {"EF-MSISDN", "+15550100, +15550101"},
@@ -75,7 +75,7 @@ TEST_F(SIMFilesTest, absurdFilesAreLeftOut) {
         putModem({{"OwnNumbers", QStringList("+1")}});
         follow();
         listen();
-        EXPECT_TRUE(tells(simCode, dictionary({{"kSimFile_MSISDN", "+1"}}))) << each.typeName();
+        EXPECT_TRUE(receives(simCode, dictionary({{"kSimFile_MSISDN", "+1"}}))) << each.typeName();
         sink.messages.clear();
         source->stop();
     }

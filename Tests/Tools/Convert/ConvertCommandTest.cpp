@@ -283,7 +283,7 @@ TEST_F(ConvertCommandTest, InterruptedConversionLeavesNothing) {
     // Nothing but time makes the test's event loop look again.
     LoopTimer look([] {});
     look.startRepeating(std::chrono::milliseconds(20));
-    ASSERT_TRUE(eventually([&] { return !outputs().empty(); })) << "the draft";
+    ASSERT_TRUE(eventually([&] { return !outputs().empty(); })) << "the temporary file";
     process.signal(SIGTERM);
     EXPECT_EQ(process.exitStatus(), 128 + SIGTERM);
     EXPECT_THAT(outputs(), ElementsAre());

@@ -69,7 +69,7 @@ protected:
 
     struct Observer final : DecodingObserver {
         void didDecode(const LoggedMessage&, LogGenerator&, Dictionary&) override { ++messages; }
-        void refreshed(Time tick, const Decoded& decoded) override {
+        void didRefresh(Time tick, const Decoded& decoded) override {
             const Dictionary* section = (*decoded.display.asDictionary())["GSM RR Info"].asDictionary();
             refreshes.push_back({tick, *(*section)["RR State"].asString()});
         }
@@ -126,7 +126,7 @@ TEST_F(DecodingTest, KeepsTheHistoryForThoseWhoWantIt) {
     struct Ended final : DecodingObserver {
         explicit Ended(bool wanted) : wantsIt(wanted) {}
         [[nodiscard]] bool wantsHistory(std::uint64_t) const override { return wantsIt; }
-        void ended(const LogGenerator&, const Dictionary& state) override {
+        void didFinish(const LogGenerator&, const Dictionary& state) override {
             const Array* history = state["History"].asArray();
             entries = history ? history->size() : 0;
             hasRawMessages = state.contains("DisplayState");

@@ -18,49 +18,49 @@ TEST(RefreshTicksTest, WithoutMessagesThereIsNoTick) {
 
 TEST(RefreshTicksTest, TicksLieEveryTwoSecondsFromTheFirstMessageOn) {
     RefreshTicks ticks;
-    EXPECT_EQ(ticks.before(start), std::nullopt);
-    EXPECT_EQ(ticks.before(start + 500ms), std::nullopt);
-    EXPECT_EQ(ticks.before(start + 2s - 1ns), std::nullopt);
-    EXPECT_EQ(ticks.before(start + 2'100ms), start + 2s);
-    EXPECT_EQ(ticks.before(start + 3s), std::nullopt);
-    EXPECT_EQ(ticks.before(start + 4'500ms), start + 4s);
+    EXPECT_EQ(ticks.tickBefore(start), std::nullopt);
+    EXPECT_EQ(ticks.tickBefore(start + 500ms), std::nullopt);
+    EXPECT_EQ(ticks.tickBefore(start + 2s - 1ns), std::nullopt);
+    EXPECT_EQ(ticks.tickBefore(start + 2'100ms), start + 2s);
+    EXPECT_EQ(ticks.tickBefore(start + 3s), std::nullopt);
+    EXPECT_EQ(ticks.tickBefore(start + 4'500ms), start + 4s);
     EXPECT_EQ(ticks.last(), start + 6s);
 }
 
 TEST(RefreshTicksTest, TickComesBeforeAMessageStampedAtIt) {
     RefreshTicks ticks;
-    EXPECT_EQ(ticks.before(start), std::nullopt);
-    EXPECT_EQ(ticks.before(start + 2s), start + 2s);
-    EXPECT_EQ(ticks.before(start + 2s), std::nullopt);
-    EXPECT_EQ(ticks.before(start + 4s), start + 4s);
+    EXPECT_EQ(ticks.tickBefore(start), std::nullopt);
+    EXPECT_EQ(ticks.tickBefore(start + 2s), start + 2s);
+    EXPECT_EQ(ticks.tickBefore(start + 2s), std::nullopt);
+    EXPECT_EQ(ticks.tickBefore(start + 4s), start + 4s);
     EXPECT_EQ(ticks.last(), start + 6s);
 }
 
 TEST(RefreshTicksTest, TicksWithoutMessagesDoNotRefresh) {
     RefreshTicks ticks;
-    EXPECT_EQ(ticks.before(start), std::nullopt);
+    EXPECT_EQ(ticks.tickBefore(start), std::nullopt);
     // Those at 4 s to 100 s have had none.
-    EXPECT_EQ(ticks.before(start + 101s), start + 2s);
-    EXPECT_EQ(ticks.before(start + 101'500ms), std::nullopt);
-    EXPECT_EQ(ticks.before(start + 102s), start + 102s);
+    EXPECT_EQ(ticks.tickBefore(start + 101s), start + 2s);
+    EXPECT_EQ(ticks.tickBefore(start + 101'500ms), std::nullopt);
+    EXPECT_EQ(ticks.tickBefore(start + 102s), start + 102s);
 }
 
 TEST(RefreshTicksTest, BackwardTimeCausesNoTick) {
     RefreshTicks ticks;
-    EXPECT_EQ(ticks.before(start), std::nullopt);
-    EXPECT_EQ(ticks.before(start - 3600s), std::nullopt);
-    EXPECT_EQ(ticks.before(Time::min()), std::nullopt);
-    EXPECT_EQ(ticks.before(start + 1s), std::nullopt);
-    EXPECT_EQ(ticks.before(start + 3s), start + 2s);
+    EXPECT_EQ(ticks.tickBefore(start), std::nullopt);
+    EXPECT_EQ(ticks.tickBefore(start - 3600s), std::nullopt);
+    EXPECT_EQ(ticks.tickBefore(Time::min()), std::nullopt);
+    EXPECT_EQ(ticks.tickBefore(start + 1s), std::nullopt);
+    EXPECT_EQ(ticks.tickBefore(start + 3s), start + 2s);
 }
 
 TEST(RefreshTicksTest, TimeThatJumpsFromTheBeginningToTheEndIsNoWork) {
     RefreshTicks ticks;
-    EXPECT_EQ(ticks.before(Time::min()), std::nullopt);
-    EXPECT_EQ(ticks.before(Time::max()), Time::min() + 2s);
+    EXPECT_EQ(ticks.tickBefore(Time::min()), std::nullopt);
+    EXPECT_EQ(ticks.tickBefore(Time::max()), Time::min() + 2s);
     // No later moment is left for a tick.
-    EXPECT_EQ(ticks.before(Time::max()), std::nullopt);
-    EXPECT_EQ(ticks.before(Time::min()), std::nullopt);
+    EXPECT_EQ(ticks.tickBefore(Time::max()), std::nullopt);
+    EXPECT_EQ(ticks.tickBefore(Time::min()), std::nullopt);
     EXPECT_EQ(ticks.last(), Time::max());
 }
 

@@ -110,7 +110,7 @@ TEST_F(RecordingSessionTest, FileThatNothingWasWrittenToIsRemoved) {
         const FileSizeLimit limit(0);
         ASSERT_TRUE((*session)->setTechnology("Ostrel_GSM")); // the head waits
         EXPECT_FALSE((*session)->close());
-        EXPECT_EQ((*session)->trouble(), "cannot write " + _file + ": File too large");
+        EXPECT_EQ((*session)->temporaryError(), "cannot write " + _file + ": File too large");
     }
     EXPECT_THAT(files(), ElementsAre());
 }

@@ -3,7 +3,7 @@
 
 #pragma once
 
-#include "Toolkit/Widgets/Tables/CellQueue.h"
+#include "Toolkit/Widgets/Tables/ReuseQueue.h"
 #include "Toolkit/Widgets/Tables/TableInput.h"
 #include "Toolkit/Widgets/Tables/TableRows.h"
 
@@ -82,7 +82,7 @@ private:
 
     TableRows _rows;
     std::map<std::size_t, std::shared_ptr<TableCell>> _cells;
-    CellQueue _queue;
+    ReuseQueue _queue;
     TableInput _input;
     std::optional<std::size_t> _selected;
     std::optional<std::size_t> _focus;

@@ -25,7 +25,7 @@ inline const std::string full = "cannot write the recording: No space left on de
 inline const std::string broken = "cannot write the recording: Input/output error";
 
 /// A recording on a disk with errors. Each message is one byte, its number.
-class RecordingTroubleFixture : public testing::Test {
+class PcapngWriterFixture : public testing::Test {
 protected:
     void start() {
         auto started =

@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Toolkit/Widgets/Motion.h"
+#include "Toolkit/Widgets/Animation.h"
 
 #include <QApplication>
 #include <QEasingCurve>
@@ -24,7 +24,7 @@ bool animationsEnabled() {
            QApplication::style()->styleHint(QStyle::SH_Widget_Animation_Duration) > 0;
 }
 
-Motion::~Motion() {
+Animation::~Animation() {
     if (_animation) {
         _animation->disconnect();
         _animation->stop();
@@ -32,7 +32,7 @@ Motion::~Motion() {
     }
 }
 
-void Motion::start(bool animated, Step step, std::function<void()> atEnd) {
+void Animation::start(bool animated, Step step, std::function<void()> atEnd) {
     finish();
     _step = std::move(step);
     _atEnd = std::move(atEnd);
@@ -53,7 +53,7 @@ void Motion::start(bool animated, Step step, std::function<void()> atEnd) {
     animation->start();
 }
 
-void Motion::finish() {
+void Animation::finish() {
     if (!_animation)
         return;
     QVariantAnimation* const animation = _animation;
@@ -68,7 +68,7 @@ void Motion::finish() {
         atEnd();
 }
 
-bool Motion::isRunning() const {
+bool Animation::isRunning() const {
     return _animation != nullptr;
 }
 

@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Toolkit/Widgets/Tables/CellQueue.h"
+#include "Toolkit/Widgets/Tables/ReuseQueue.h"
 
 #include "Toolkit/Tables/TableCell.h"
 
@@ -11,12 +11,12 @@
 
 namespace velmora {
 
-void CellQueue::add(std::shared_ptr<TableCell> cell) {
+void ReuseQueue::add(std::shared_ptr<TableCell> cell) {
     auto& waiting = _waiting[cell->reuseIdentifier()];
     waiting.push_back(std::move(cell));
 }
 
-std::shared_ptr<TableCell> CellQueue::take(std::string_view identifier) {
+std::shared_ptr<TableCell> ReuseQueue::take(std::string_view identifier) {
     const auto found = _waiting.find(identifier);
     if (found == _waiting.end() || found->second.empty())
         return nullptr;
@@ -25,13 +25,13 @@ std::shared_ptr<TableCell> CellQueue::take(std::string_view identifier) {
     return cell;
 }
 
-void CellQueue::hideAll() {
+void ReuseQueue::hideAll() {
     for (const auto& [identifier, waiting] : _waiting)
         for (const auto& cell : waiting)
             cell->setHidden(true);
 }
 
-void CellQueue::clear() {
+void ReuseQueue::clear() {
     for (const auto& [identifier, waiting] : _waiting)
         for (const auto& cell : waiting)
             cell->widget()->setParent(nullptr);

@@ -18,15 +18,15 @@ namespace velmora {
 
 /// One animation at a time, from 0 to 1, that can be ended early. Its owner may be destroyed in its
 /// callbacks.
-class Motion {
+class Animation {
 public:
     using Step = std::function<void(double)>;
 
-    Motion() = default;
+    Animation() = default;
     /// Stops without calling anything.
-    ~Motion();
-    Motion(const Motion&) = delete;
-    Motion& operator=(const Motion&) = delete;
+    ~Animation();
+    Animation(const Animation&) = delete;
+    Animation& operator=(const Animation&) = delete;
 
     /// Ends an earlier animation first. Calls `step` during the animation, with 1 at last, then `atEnd`; both
     /// immediately when not animated or with reduced motion.

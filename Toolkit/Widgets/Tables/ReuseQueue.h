@@ -14,7 +14,7 @@ namespace velmora {
 class TableCell;
 
 /// Cells that are queued for reuse, by reuse identifier; last in, first out.
-class CellQueue {
+class ReuseQueue {
 public:
     void add(std::shared_ptr<TableCell> cell);
     /// Null when none waits.
