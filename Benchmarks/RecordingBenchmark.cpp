@@ -117,7 +117,7 @@ void BM_ReadHolding(benchmark::State& state) {
 }
 BENCHMARK(BM_ReadHolding)->Unit(benchmark::kMillisecond);
 
-/// How long a recorder's event loop stands still to have 64 KiB put on the disk of the working directory.
+/// How long syncing 64 KiB to the disk of the working directory blocks a recorder's event loop.
 template <class Save>
 void save(benchmark::State& state, Save save) {
     const std::string path = "recording-benchmark-" + std::to_string(::getpid());

@@ -73,7 +73,7 @@ public:
     void reconnect() { _decoder = _maker.newDecoder(); }
 
     [[nodiscard]] Dictionary& state() { return *_state; }
-    /// As it stands, none before it has been built.
+    /// The current one; none before the first has been built.
     [[nodiscard]] Value display() { return _decoder->display(*_state); }
     [[nodiscard]] const LogGenerator& decoder() const { return *_decoder; }
 

@@ -40,8 +40,8 @@ bool same(const Contents& a, const Contents& b) {
            std::equal(a.losses.begin(), a.losses.end(), b.losses.begin(), b.losses.end(), sameLoss);
 }
 
-/// The input's first byte tells in how long pieces the source gives the rest, which is a file of the reader's
-/// form. `hasOffsets`: offsets are places in the file, and messages its bytes.
+/// The input's first byte sets the size of the source's reads from the rest, which is a file of the reader's
+/// form. `hasOffsets`: offsets are positions in the file, and messages its bytes.
 template <class Reader>
 class FileTarget final : public FuzzTarget {
 public:

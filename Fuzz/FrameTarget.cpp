@@ -17,7 +17,7 @@ struct Taken {
     std::string failure;
 };
 
-/// The input's first byte tells how long the pieces are in which the rest arrives.
+/// The input's first byte sets the size of the parts in which the rest arrives.
 class FrameTarget final : public FuzzTarget {
 public:
     void run(Bytes input) override {

@@ -12,7 +12,7 @@ namespace velmora {
 namespace {
 
 /// What a snapshot would save of a technology's drive: the first message of each code, a redraw after every
-/// `perRedraw` of them. The displays are left empty, which no reader looks at.
+/// `perRedraw` of them. The displays are empty, since no reader reads them.
 Value savedContents(const FuzzedTechnology& technology, std::size_t perRedraw) {
     const ShippedTemplates templates;
     const DecoderMaker maker(technology);

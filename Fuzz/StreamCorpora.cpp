@@ -15,7 +15,7 @@ namespace velmora {
 
 namespace {
 
-/// A few messages, short ones, since files and streams look at none of their bytes.
+/// A few messages, short ones, since files and streams do not read their bytes.
 std::vector<Data> someMessages() {
     constexpr std::size_t longest = 64;
     std::vector<Data> messages;

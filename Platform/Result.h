@@ -9,8 +9,8 @@
 
 namespace velmora {
 
-/// Why something could not be done: lower-case prose without a full stop that gives the value found and the
-/// value wanted, ready to follow "file: " in a message.
+/// Why something could not be done: lower-case prose without a full stop with the found and the expected
+/// value, to be appended to "file: " in a message.
 struct Failure {
     std::string reason;
 };

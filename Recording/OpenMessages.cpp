@@ -53,7 +53,7 @@ Result<std::unique_ptr<MessageReader>> openMessages(const std::string& path) {
 }
 
 Result<std::unique_ptr<MessageReader>> openMessages(ChunkedInput input) {
-    // As much as it takes to tell and no more: on a pipe that may be all there is for a while.
+    // Reads no more than the decision needs: on a pipe more may take a while to arrive.
     constexpr std::string_view sectionHeader = "\n\r\r\n";
     static_cast<void>(input.ensure(sectionHeader.size()));
     if (startsWith(input.available(), sectionHeader))

@@ -62,7 +62,7 @@ void WorkContext::installTerminateHandler() {
 }
 
 void WorkContext::terminate() noexcept {
-    // Nothing here asks for memory, since there may be none left.
+    // Allocates nothing, since memory may be exhausted.
     const char* const reason = terminationReason();
     const WorkContext* const context = currentContext;
     if (!context)

@@ -10,7 +10,7 @@ namespace velmora {
 
 /// Notifies the service manager that started this program of its state, by datagrams to the socket that
 /// $NOTIFY_SOCKET names (see sd_notify). Where the variable is not set, nothing is sent. What cannot be sent
-/// is an error line; the program goes on.
+/// is an error line; the program continues.
 class ServiceManager {
 public:
     /// Takes the socket's name from the environment.

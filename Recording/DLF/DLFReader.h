@@ -23,7 +23,8 @@ namespace velmora {
 class DLFReader final : public RecordChainReader {
 public:
     /// Opens an input of which nothing has been skipped, and looks ahead for its technology. Fails when it
-    /// cannot be read, or does not begin as a DLF log does. `wanted` is what the reason says was wanted.
+    /// cannot be read, or does not begin as a DLF log does. `wanted` is what the failure's reason names as
+    /// expected.
     static Result<std::unique_ptr<DLFReader>>
     open(ChunkedInput input, std::string_view wanted = "a DLF log's version report or log records");
 

@@ -16,10 +16,10 @@
 
 namespace velmora {
 
-/// Writes a DLF log: the version report, then one record a message, so that DLFReader gives the same messages
-/// again, byte for byte. A record is written without its type byte, as the format has it, where its code
-/// implies the type (see impliedType). Any other message is written as it arrived, with type byte and prefix,
-/// as in the application's own logs.
+/// Writes a DLF log: the version report, then one record a message, so that DLFReader returns the same
+/// messages again, byte for byte. A record is written without its type byte, as the format has it, where its
+/// code implies the type (see impliedType). Any other message is written as it arrived, with type byte and
+/// prefix, as in the application's own logs.
 ///
 /// The log keeps no times but those in the records. A message that a reader could not find the end of,
 /// because it has no whole header or its length field is not its length, is refused. Once writing has failed

@@ -19,7 +19,7 @@ bool isStream(std::uint8_t type) {
     return type == LogMessage::basebandType || type == LogMessage::extraType;
 }
 
-/// What the framing says; none where the bytes do not have it.
+/// The score of the framing; absent where the bytes do not have it.
 std::optional<int> scoreOfFraming(Bytes bytes, Framing framing, const RecordWeights& weights) {
     if (framing == Framing::Nothing)
         return 0;

@@ -13,7 +13,7 @@
 
 namespace velmora {
 
-/// What stands before a record's length field in raw material or a DLF log.
+/// The bytes before a record's length field in raw messages or a DLF log.
 enum class Framing : std::uint8_t {
     Type,          ///< the type, of either stream
     Prefix,        ///< a prefix and the type
@@ -28,7 +28,7 @@ inline constexpr Framing allFramings[] = {Framing::Type, Framing::Prefix, Framin
 /// Bytes that the framing takes.
 [[nodiscard]] std::size_t sizeOf(Framing framing);
 
-/// A record that some bytes may be, and how much says that they are one.
+/// A possible record at some bytes, and how strong the evidence for it is.
 struct RecordCandidate {
     /// A record's header less its type byte: length, code, time stamp.
     static constexpr std::size_t bareHeaderLength = LogMessage::headerLength - 1;
@@ -39,7 +39,7 @@ struct RecordCandidate {
     std::uint16_t code = 0;
     std::uint64_t timestamp = 0;
     int score = 0;         ///< from its own header, in bits (see RecordWeights)
-    int followerScore = 0; ///< from what stands at its end; for RecordChain to fill in
+    int followerScore = 0; ///< from what follows it; set by RecordChain
 
     /// The record that begins at the first byte with that framing; none where the bytes are too few for its
     /// header or cannot be one. `nearby` is the time stamp of a record close to it.

@@ -84,7 +84,7 @@ int RecordChain::scoreAt(std::size_t at, std::optional<std::uint64_t> nearby) {
     return most;
 }
 
-/// Weighs what stands where the candidate at `at` ends. False if that is past the end of the input.
+/// Scores what follows the candidate at `at`. False if that is past the end of the input.
 bool RecordChain::scoreFollower(std::size_t at, RecordCandidate& candidate) {
     const std::size_t end = at + candidate.size;
     if (!_input.ensure(end))
@@ -169,8 +169,7 @@ void RecordChain::skipDamage(const Survey& survey) {
         loss.reason = "record cut off after " + std::to_string(loss.bytes) + " of " +
                       std::to_string(survey.truncated->size) + " bytes";
     else if (header)
-        loss.reason =
-            "record length " + std::to_string(header->length) + " does not lead to another record";
+        loss.reason = "record length " + std::to_string(header->length) + " does not lead to another record";
     else
         loss.reason = "no log record";
     // Raw material is whole; a log's writer may have stopped in the middle of a record.

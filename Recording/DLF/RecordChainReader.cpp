@@ -19,7 +19,7 @@ namespace velmora {
 
 namespace {
 
-/// Messages that each technology's decoder wants.
+/// Counts the messages whose code each technology's decoder subscribes to.
 class Votes {
 public:
     void add(Bytes message) {

@@ -27,7 +27,7 @@ public:
     /// Whether the file can be truncated and synced, as a regular file can. The operations below are for such
     /// files only.
     [[nodiscard]] virtual bool isRegular() const = 0;
-    /// Truncates the file to the first `size` bytes that were written; writing goes on after these.
+    /// Truncates the file to the first `size` bytes that were written; writing continues after these.
     virtual int truncateTo(std::uint64_t size) = 0;
     /// Starts to sync all that was written, in the background. Does nothing while an earlier call's outcome
     /// has not been taken.

@@ -75,7 +75,7 @@ const BlockReader::Block* BlockReader::next() {
     }
 }
 
-/// Looks at the block that the input stands at, reading as much of it as its length says.
+/// Checks the block at the input's position, and reads as much of it as its length says.
 BlockReader::Fault BlockReader::checkBlock(Block& block) {
     block.offset = _input.offset();
     block.length = 0;

@@ -52,7 +52,7 @@ std::optional<InterfaceDescription> InterfaceDescription::read(Bytes body, bool 
             return std::nullopt;
         if (option == pcapng::Option::InterfaceName) {
             const Bytes name = body.subspan(value, std::min(length, maximumName));
-            // Some writers end the text with a zero, which the format does not ask for.
+            // Some writers end the text with a zero, which the format does not require.
             description.name.assign(name.begin(), std::find(name.begin(), name.end(), std::uint8_t{0}));
         } else if (option == pcapng::Option::TimeResolution) {
             if (length != 1)

@@ -141,7 +141,7 @@ void SnapshotReader::openEntry(const Value& entry) {
 }
 
 void SnapshotReader::openRecords(const Data& bytes, RecordChain::Layout layout) {
-    constexpr std::size_t slack = 8192; // more than a chunk wants at its end
+    constexpr std::size_t slack = 8192; // more than a chunk needs at its end
     const std::size_t chunk = std::min(bytes.size() + slack, ChunkedInput::defaultChunkSize);
     _records.emplace(ChunkedInput(std::make_unique<DataSource>(bytes), chunk), layout);
     _size = bytes.size();
@@ -188,7 +188,7 @@ std::optional<LoggedMessage> SnapshotReader::nextOfEntry() {
     return std::exchange(_pending, std::nullopt);
 }
 
-/// What stands before the reason of a loss.
+/// The prefix of a loss's reason.
 std::string SnapshotReader::place() const {
     return "entry " + std::to_string(_nextEntry) + ": ";
 }

@@ -17,11 +17,11 @@ namespace velmora {
 /// Reads a snapshot: a property list, XML or binary, that holds "Timestamp", "Data" and "Description"; "Data"
 /// is the history's entries, oldest first, and for the binary technologies a DLF log.
 ///
-/// An entry stands for one refresh. Its "DisplayState" is the raw material that the refresh had: of the
-/// binary technologies the messages as they arrived, one after the other; of the serialized-object
-/// technology the object of the last message before it, which is given as the one message of the entry,
-/// serialized anew. An entry without raw material is left out; where no entry has any, the messages are those
-/// of the DLF log, if there is one, with the times that DLFReader gives them.
+/// An entry is one refresh. Its "DisplayState" has the raw messages of the refresh: of the binary
+/// technologies the messages as they arrived, one after the other; of the serialized-object technology the
+/// object of the last message before it, which is serialized again and is the entry's one message. An entry
+/// without raw messages is skipped; if no entry has any, the messages are those of the DLF log, if there is
+/// one, with DLFReader's times.
 ///
 /// The last message of an entry has the refresh, at the entry's "Date"; an entry without a readable date is 2
 /// s after the previous one, and the first one at the snapshot's "Timestamp". An entry whose messages cannot

@@ -14,7 +14,7 @@
 /// such a member is omitted.
 namespace velmora::convert {
 
-/// An unsigned number of at most `maximum`, as it stands.
+/// An unsigned number of at most `maximum`, unchanged.
 template <std::int64_t maximum>
 [[nodiscard]] Value number(const Value& member) {
     const std::int64_t* number = member.asInteger();

@@ -31,8 +31,8 @@ std::string absence(const BusReply& reply) {
 
 ModemFollower::ModemFollower(MainQueue& queue, Options options, Observer& observer)
     : _queue(queue), _options(std::move(options)), _observer(observer), _bus(_options.busAddress, *this) {
-    // Started by hand, this may be the one who wants ModemManager to run; later it may have been stopped for
-    // a reason.
+    // At the start ModemManager may be activated, since this service may be its first user; later it may have
+    // been stopped on purpose, and is not.
     open(true);
 }
 

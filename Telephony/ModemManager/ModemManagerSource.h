@@ -18,8 +18,8 @@ namespace velmora {
 
 /// The modem that ModemManager manages, live: the service's extra stream with its cells, its SIM and its
 /// bearers. Its technology follows the access technology of the modem; it is empty until a modem is known,
-/// and stays what it was while the modem is on no network or gone. The modem is queried only between `start`
-/// and `stop`. Main thread only.
+/// and stays what it was while the modem is on no network or has been removed. The modem is queried only
+/// between `start` and `stop`. Main thread only.
 class ModemManagerSource final : public LogSource, private ModemFollower::Observer {
 public:
     /// Looks for modems from now on. Queue and clock must outlive the source.

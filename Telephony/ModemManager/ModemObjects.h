@@ -45,8 +45,8 @@ public:
 
     /// The modem of that path; null where there is none. Valid until the next change.
     [[nodiscard]] const Modem* find(std::string_view path) const;
-    /// The modem to follow: the one of the wanted index, or, where none is wanted, `current` while it has a
-    /// SIM or none has, otherwise the first with a SIM, otherwise the first. Null where there is none.
+    /// The modem to follow: the one of the requested index, or, without one, `current` while it has a SIM or
+    /// none has, otherwise the first with a SIM, otherwise the first. Null where there is none.
     [[nodiscard]] const Modem* choose(std::optional<std::uint32_t> wanted, std::string_view current) const;
     /// "0, 2"; empty where there is no modem.
     [[nodiscard]] std::string indices() const;

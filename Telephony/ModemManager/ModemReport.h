@@ -29,8 +29,8 @@ using Dictionaries = std::vector<DictionaryRef>;
 /// The cells of an answer of GetCellInfo. The modem adds the levels of the serving cell.
 [[nodiscard]] Dictionaries cellsOf(const Value& cellInformation, const Modem& modem);
 [[nodiscard]] bool hasServingCell(const Dictionaries& cells);
-/// The serving cell that an answer of GetLocation names; null where it names none. The modem's properties
-/// give its technology.
+/// The serving cell that an answer of GetLocation names; null where it names none. Its technology is the
+/// modem's.
 [[nodiscard]] DictionaryRef servingCellFromLocation(const Value& location, const Modem& modem);
 
 /// The SIM's files; `sim` are the properties of the SIM object.

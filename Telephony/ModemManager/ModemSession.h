@@ -18,9 +18,9 @@
 
 namespace velmora {
 
-/// Asks the followed modem for as long as it lives, which is while a client listens and that modem is there:
-/// its cells at a steady pace, its SIM and bearers once and then by their signals. It has ModemManager poll
-/// the levels too, and puts its rate back in the end. No question is asked again before its answer. Main
+/// Queries the followed modem during its lifetime, which is while a client listens and the modem is present:
+/// the cells periodically, the SIM and bearers once and then when their signals arrive. Has ModemManager poll
+/// the levels too, and restores its rate on destruction. A query is not repeated before its answer. Main
 /// thread only.
 class ModemSession {
 public:
@@ -99,7 +99,7 @@ private:
     bool _hadCells = false;                    ///< the last answer had cells
     std::optional<std::uint32_t> _earlierRate; ///< ModemManager's earlier rate; absent while it is unchanged
     bool _hadSignal = false;
-    Value _state;                       ///< the modem's when last looked at
+    Value _state;                       ///< the modem's at the last change
     std::string _sim;                   ///< the SIM's path
     std::vector<std::string> _bearers;  ///< the bearers' paths
     std::map<std::string, Part> _parts; ///< by path

@@ -99,8 +99,8 @@ Value LogServer::createChannel(const Data& request) {
         logFormat(LogPriority::Error, "%s requests a log channel, but there is no such port", name->c_str());
         return refusal(Refusal::NoSuchPort);
     }
-    // A name has one owner: an open channel to that name is one to an owner who has gone, or an earlier one
-    // of the same owner's, who would now get everything twice.
+    // A name has one owner: an open channel to that name is to an owner that has ended, or an earlier one of
+    // the same owner, which would now get everything twice.
     for (const ChannelRef& channel : _channels)
         if (channel->applicationName() == *name)
             close(*channel, *name + " has gone");
@@ -213,7 +213,7 @@ void LogServer::startStreaming(LogChannel& channel, const Dictionary& command) {
         logFormat(LogPriority::Error, "%s: %s", channel.name().c_str(), filter.reason().c_str());
         return;
     }
-    // Whoever has gone must not keep a run of the source alive that a new client would then join half-way.
+    // A client that has ended must not keep the source running, or the new client would join in mid-run.
     removeClosedChannels();
     channel.stream(*std::move(filter));
     logFormat(LogPriority::Notice, "%s: streaming to %s", channel.name().c_str(),

@@ -19,15 +19,15 @@
 
 namespace velmora {
 
-/// The telephony service's ports: the server port, on which clients ask for log channels, and the channels.
+/// The telephony service's ports: the server port, on which clients request log channels, and the channels.
 ///
 /// The source runs while at least one channel streams. It is started with the first one and stopped after the
 /// last, so that a single client always gets the stream from its start. A client that joins later first gets
 /// the latest message of each code of the extra stream, since those describe a state. A channel closes when
 /// the connection to its client's port ends, or when a new one is made for the same port. When the source's
 /// technology changes all channels close, so that their clients reconnect and query it again; while the
-/// source does not know its technology, GetTechnology is answered without one. Invalid commands give an error
-/// line and change nothing. Main thread only.
+/// source's technology is unknown, GetTechnology is answered without one. Invalid commands are logged as
+/// errors and ignored. Main thread only.
 class LogServer final : private LogSink {
 public:
     /// The reasons for refusing a request for a channel.

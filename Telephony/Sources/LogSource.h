@@ -16,8 +16,8 @@ public:
     virtual ~LogSink() = default;
     /// One log message, exactly as it is to arrive at the application's port.
     virtual void receive(const Data& message) = 0;
-    /// False while a client that is worth waiting for still has much to take. A source that keeps a pace of
-    /// its own sends on regardless; one that runs as fast as it can waits.
+    /// False while the queue of a client that still reads is full. A source with a pace of its own ignores
+    /// it; one that runs as fast as possible waits.
     [[nodiscard]] virtual bool hasRoom() const = 0;
 };
 

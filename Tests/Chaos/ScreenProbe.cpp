@@ -28,7 +28,7 @@ double now_s() {
     return std::chrono::duration<double>(std::chrono::steady_clock::now().time_since_epoch()).count();
 }
 
-/// Resident memory; 0 where the system does not tell.
+/// Resident memory; 0 where the system does not report it.
 long resident_KiB() {
     std::ifstream status("/proc/self/status");
     for (std::string line; std::getline(status, line);)

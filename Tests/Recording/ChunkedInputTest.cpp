@@ -111,7 +111,7 @@ TEST(ChunkedInput, ofNothingHasNothing) {
     EXPECT_FALSE(input.failure());
 }
 
-/// Memory that tells how much room it was given to read into.
+/// A memory source that records the largest buffer that it was given.
 class WatchedSource final : public ByteSource {
 public:
     WatchedSource(Data data, std::size_t& mostRoom) : _memory(std::move(data)), _mostRoom(mostRoom) {}

@@ -33,8 +33,8 @@ namespace velmora {
 /// The same as a file, an XML or a binary property list.
 [[nodiscard]] Data snapshotFile(std::initializer_list<Value> entries, bool binary = false);
 
-/// What openMessages and the reader gave until the end. A message that a refresh follows has its time behind
-/// it: "1 at 0, 5 ns: 0A0B, refresh at 2 ns".
+/// What openMessages and the reader returned until the end. A message that a refresh follows is followed by
+/// the refresh's time: "1 at 0, 5 ns: 0A0B, refresh at 2 ns".
 [[nodiscard]] ReadOut readAnyForm(const Data& file, std::size_t piece = SIZE_MAX,
                                   std::size_t good = SIZE_MAX);
 

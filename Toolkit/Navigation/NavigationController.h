@@ -14,8 +14,8 @@ namespace velmora {
 class NavigationView;
 
 /// A stack of screens ("panes"), of which the top one shows, between a header (title, back button) above and,
-/// unless hidden, the top pane's toolbar below. The stack holds its panes. Operations change the stack at
-/// once; what is animated is only the picture, and only where the user wants motion. An operation ends the
+/// unless hidden, the top pane's toolbar below. The stack holds its panes. Operations change the stack
+/// immediately; only the drawing is animated, and only without reduced motion. An operation ends the
 /// animation of the previous one.
 ///
 /// Escape, Alt-Left and the back key of a device pop the top pane.

@@ -33,7 +33,7 @@ public:
     /// The base's notices do nothing; a subclass forwards them or not as it likes.
     virtual void viewDidLoad();
     virtual void viewWillAppear(bool animated);
-    /// Once the screen stands still in its place.
+    /// After the animation that shows the screen.
     virtual void viewDidAppear(bool animated);
     virtual void viewWillDisappear(bool animated);
     virtual void viewDidDisappear(bool animated);

@@ -34,7 +34,7 @@ public:
     ShownProgress(const std::string& path, const DecodeOptions& options) {
         if (::isatty(STDERR_FILENO) == 0)
             return;
-        // On the same terminal it would stand between the lines.
+        // On the same terminal it would mix with the lines.
         if (writesAsItGoes(options) && ::isatty(STDOUT_FILENO) != 0)
             return;
         const std::optional<std::uint64_t> size = inputSize(path);

@@ -40,7 +40,7 @@ void DecodeProgress::update(std::uint64_t offset) {
     if (now - _shown < showInterval || elapsed <= 0)
         return;
     _shown = now;
-    // A file may grow while it is read, from nothing even: then there is no telling how much is left.
+    // A file may grow while it is read, even from an empty one; the rest cannot be estimated then.
     const std::uint64_t done = std::min(offset, _size);
     if (done == 0)
         return;

@@ -39,7 +39,7 @@ Result<Decoded> decodeMessages(MessageReader& reader, const DecodingRequest& req
         refreshes.done();
         decoded.refreshes = refreshes.count();
         clock.setNow(tick);
-        // A refresh that nobody sees does nothing but, where there is no display yet, log why.
+        // A refresh without a reader is skipped, unless there is no display yet: then it logs the reason.
         if (keepsHistory || wantsEveryRefresh || !state.contains("Display"))
             decoded.display = (*decoder)->generateLogUsingState(state);
         observer.didRefresh(tick, decoded);

@@ -22,8 +22,8 @@ private:
 };
 
 /// The refreshes of a recording, at the application's interval: ticks lie every 2 s of recorded time from the
-/// first message on, and a tick with messages since the last one refreshes. Time stamps that go back make no
-/// tick due; a jump ahead costs the same whatever its length.
+/// first message on, and a tick with messages since the last one refreshes. Time stamps that go back cause no
+/// tick; a jump ahead of any length takes constant time.
 class RefreshTicks {
 public:
     static constexpr std::chrono::nanoseconds interval = std::chrono::seconds(2);

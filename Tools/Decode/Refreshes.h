@@ -12,8 +12,8 @@
 
 namespace velmora {
 
-/// When a file's display is refreshed while its messages are decoded one after the other: on the grid of
-/// RefreshTicks, or where the file itself says when (a snapshot does).
+/// When a file's display is refreshed while its messages are decoded in order: on the grid of RefreshTicks,
+/// or where the file itself says when (a snapshot does).
 class Refreshes {
 public:
     /// The refresh that is due before this message is decoded, if any.
@@ -22,7 +22,7 @@ public:
         const std::optional<Time> tick = _ticks.tickBefore(message.time);
         return tick && !_fileHasRefreshes ? tick : std::nullopt;
     }
-    /// The message, which is not decoded, is passed over: the refresh that is due after it, if any.
+    /// The message is skipped without being decoded: the refresh that is due after it, if any.
     [[nodiscard]] std::optional<Time> afterSkipped(const LoggedMessage& message) {
         _fileHasRefreshes = _fileHasRefreshes || message.refresh;
         return _isPending ? message.refresh : std::nullopt;
@@ -44,12 +44,12 @@ public:
 
 private:
     RefreshTicks _ticks;
-    bool _fileHasRefreshes = false; ///< and then its refreshes are all there are
+    bool _fileHasRefreshes = false; ///< if so, there are no other refreshes
     bool _isPending = false;        ///< a message has been decoded since the last refresh
     std::uint64_t _count = 0;
 };
 
-/// How many refreshes decoding all messages takes, from where the reader stands to its end.
+/// How many refreshes decoding all messages takes, from the reader's position to its end.
 [[nodiscard]] std::uint64_t countRefreshes(MessageReader& reader);
 
 } // namespace velmora

@@ -11,9 +11,9 @@
 
 namespace velmora {
 
-/// Stands in for the process's resources while it lives, and remembers the first that could not be read. A
-/// decoder logs that and goes on without its template, as it does on a phone, but what it then shows is not
-/// what the file holds. Main thread only; the destructor restores the earlier resources.
+/// Replaces the process's resources during its lifetime, and records the first that could not be read. A
+/// decoder logs that and continues without its template, as on a phone, but its display then lacks part of
+/// the file. Main thread only; the destructor restores the earlier resources.
 class TrackedResources final : public Resources {
 public:
     TrackedResources() : _others(setResources(this)) {}

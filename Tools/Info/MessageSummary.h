@@ -36,7 +36,7 @@ public:
     /// The earliest and the latest time stamp; absent without messages.
     [[nodiscard]] const std::optional<Time>& first() const { return _first; }
     [[nodiscard]] const std::optional<Time>& last() const { return _last; }
-    /// By log code, as LogMessage::logCode gives it.
+    /// By log code, as LogMessage::logCode returns it.
     [[nodiscard]] const std::map<std::uint32_t, Count>& codes() const { return _codes; }
     /// Shorter than a header, which decoders drop.
     [[nodiscard]] const Count& tooShort() const { return _tooShort; }
@@ -57,10 +57,10 @@ private:
     Count _prefixed;
 };
 
-/// What the decoder of a technology knows the log codes by.
+/// A technology's names of log codes.
 struct CodeNames {
     const char* heading = "sections";
-    /// Returns an empty text for a code that no section wants. Null without a decoder.
+    /// Returns an empty text for a code without subscriber. Null without a decoder.
     std::function<std::string(std::uint32_t code)> nameOf;
 };
 

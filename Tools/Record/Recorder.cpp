@@ -59,15 +59,15 @@ int Recorder::run() {
     return status;
 }
 
-/// The service has named the technology. Whether its messages are wanted: without a decoder there is no
-/// command that would make the service send anything.
+/// The service has named the technology. Returns whether to start streaming: without a decoder there is no
+/// start command to send.
 bool Recorder::learn(std::string_view technology, bool hasDecoder) {
     if (_ended)
         return false;
     if (!hasDecoder)
         return check(Failure{"the telephony service speaks " + std::string(shortTechnologyName(technology)) +
                              ", which has no decoder here, wanted one of " + technologyNames()});
-    // It may have gone and come back between two checks.
+    // It may have ended and restarted between two checks.
     if (std::exchange(_streaming, false))
         serviceIsGone();
     if (!check(_session.setTechnology(technology)))

@@ -12,7 +12,7 @@
 
 namespace velmora {
 
-/// What the user is told while a recording is made: messages on standard error and in the log, and a line of
+/// Reports to the user while a recording is made: messages on standard error and in the log, and a line of
 /// progress where standard error is a terminal. Main thread only.
 class RecordingNews {
 public:
@@ -21,8 +21,7 @@ public:
 
     /// A message that the user must get even without looking at the terminal: it goes to the log as well.
     void notify(const std::string& text);
-    /// Tells each change once: trouble that has come up, messages for which there is no room, trouble that
-    /// has passed.
+    /// Reports each change once: a temporary error, dropped messages, the end of the error.
     void reportWriteError();
 
     void showProgress(Time now, bool isConnected);
@@ -35,7 +34,7 @@ private:
     std::unique_ptr<ProgressLine> _progress;
     bool _reportedError = false;
     bool _reportedDropping = false;
-    std::uint64_t _droppedBefore = 0; ///< in all earlier trouble
+    std::uint64_t _droppedBefore = 0; ///< in all earlier errors
 };
 
 } // namespace velmora

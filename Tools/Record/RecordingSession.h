@@ -32,13 +32,13 @@ public:
     /// To be called when the service has named the technology. The first call starts the recording; another
     /// technology after that is a failure.
     Result<Done> setTechnology(std::string_view technology);
-    /// A message has arrived. A failure ends the recording; an error that may pass is none (see `trouble`).
-    /// Precondition: the technology is known.
+    /// A message has arrived. A failure ends the recording; a temporary error is not a failure (see
+    /// `temporaryError`). Precondition: the technology is known.
     Result<Done> append(Time time, Bytes message);
-    /// Writes what is buffered to the file, and has the system begin to write it to the medium; nothing
-    /// before the technology is known. Retries after trouble. A failure is as above.
+    /// Writes the buffer to the file and starts its sync to storage; does nothing before the technology is
+    /// known. Retries after a temporary error. A failure is as above.
     Result<Done> save();
-    /// Ends the recording. Trouble that has not passed is a failure now.
+    /// Ends the recording. A temporary error that persists is a failure now.
     Result<Done> close();
 
     /// The technology's short name; empty while it is unknown.
@@ -66,7 +66,7 @@ public:
 private:
     explicit RecordingSession(std::string path) : _path(std::move(path)) {}
 
-    /// Turns an error that may pass into success, and keeps it as the trouble.
+    /// Turns a temporary error into success, and keeps its reason.
     [[nodiscard]] Result<Done> keepTemporaryError(Result<Done> result);
 
     std::string _path;

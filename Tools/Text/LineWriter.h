@@ -12,9 +12,8 @@
 
 namespace velmora {
 
-/// A writer of one line per refresh or message. Lines are written out in large pieces, and with `isLive`,
-/// since a reader may be waiting for them, at each refresh as well. A line that has not been ended is never
-/// written out.
+/// A writer of one line per refresh or message. Lines are written in large blocks, and with `isLive`, since a
+/// reader may be waiting for them, at each refresh as well. An incomplete line is never written.
 class LineWriter : public DecodeWriter {
 public:
     void didRefresh(Time tick, const Decoded& decoded) override;

@@ -9,9 +9,9 @@
 
 namespace velmora {
 
-/// Text that a terminal shows as it stands: what a recording holds must not be able to control it. Line
-/// feeds, tabs and carriage returns become "\n", "\t", "\r", other control characters "\xNN" or "\u{NN}", and
-/// a byte that is no UTF-8 becomes U+FFFD. Text without any of these is unchanged.
+/// Text that is safe to print: a recording's content must not be able to control the terminal. Line feeds,
+/// tabs and carriage returns become "\n", "\t", "\r", other control characters "\xNN" or "\u{NN}", and a byte
+/// that is no UTF-8 becomes U+FFFD. Text without any of these is unchanged.
 [[nodiscard]] std::string printable(std::string_view text);
 
 /// The terminal columns that printable text takes, as Unicode has them: none for combining marks, two for

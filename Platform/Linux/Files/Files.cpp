@@ -22,8 +22,7 @@ Result<Data> readFile(const std::filesystem::path& path, std::size_t maximumByte
     FileDescriptor file(::open(path.c_str(), O_RDONLY | O_CLOEXEC));
     if (!file)
         return Failure{"cannot be opened: " + errnoText(errno)};
-    // The size that the system gives is no promise: read until the end, one byte past what is allowed at
-    // most.
+    // The reported size may be wrong: read until the end, at most one byte more than allowed.
     std::vector<std::uint8_t> content;
     std::size_t size = 0;
     for (;;) {

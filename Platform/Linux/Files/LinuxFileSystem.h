@@ -16,7 +16,7 @@ public:
     struct Options {
         /// Put before absolute paths; empty for none.
         std::filesystem::path sysroot;
-        /// Where snapshots go, as it stands; empty for the standard place: $XDG_STATE_HOME/velmora
+        /// The snapshots' directory, used unchanged; empty for the default: $XDG_STATE_HOME/velmora
         /// (~/.local/state/velmora) under the system root.
         std::filesystem::path logDirectory;
     };

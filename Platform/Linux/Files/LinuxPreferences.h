@@ -22,7 +22,7 @@ namespace velmora {
 /// "/com/velmora/Preferences".
 class LinuxPreferences final : public Preferences {
 public:
-    /// `directory` empty stands for $XDG_CONFIG_HOME (~/.config), `busAddress` empty for the session's bus.
+    /// An empty `directory` means $XDG_CONFIG_HOME (~/.config), an empty `busAddress` the session's bus.
     explicit LinuxPreferences(std::filesystem::path directory = {}, std::string busAddress = {});
 
     void setBoolean(std::string_view domain, std::string_view key, bool value) override;

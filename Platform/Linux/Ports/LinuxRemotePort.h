@@ -34,8 +34,8 @@ public:
     [[nodiscard]] bool isValid() const override;
     void setInvalidationCallback(std::function<void(RemotePort&)> callback) override;
     void invalidate() override;
-    /// As RemotePort says; what `post` has queued goes out first, within `sendTimeout`. A connection that
-    /// ends while the message is being sent gives BecameInvalid too.
+    /// As RemotePort says; what `post` has queued goes out first, within `sendTimeout`. The answer is
+    /// BecameInvalid also for a connection that ends while the message is being sent.
     Answer sendRequest(std::int32_t messageId, const Data& payload, std::chrono::nanoseconds sendTimeout,
                        std::chrono::nanoseconds receiveTimeout, bool wantsReply) override;
     void post(std::int32_t messageId, const Data& payload) override;

@@ -38,7 +38,7 @@ public:
     /// are not read until it does, so that it cannot fill this process's memory.
     [[nodiscard]] bool hasReplyBacklog() const;
 
-    /// Set by the port while the connection stands in its list of connections to serve.
+    /// Set by the port while the connection is in its list of connections to serve.
     bool queued = false;
 
 private:

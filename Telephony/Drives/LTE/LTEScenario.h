@@ -48,7 +48,7 @@ private:
     /// Reselects to the best cell of the next carrier.
     void changeCarrier();
     void connectBriefly();
-    /// Tells the network of the tracking area, where it knows another.
+    /// Sends a tracking area update if the network has another area.
     void updateArea();
     void powerOff();
 

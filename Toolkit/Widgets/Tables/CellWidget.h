@@ -17,11 +17,11 @@ class CellWidget : public QWidget {
 public:
     CellWidget();
 
-    /// Null once the cell is gone.
+    /// Null after the cell's destruction.
     TableCell* cell = nullptr;
-    /// The row that the cell stands for, counted through all sections; none while it waits to be used again.
+    /// The cell's row, counted through all sections; absent while it is queued for reuse.
     std::optional<std::size_t> row;
-    /// The row that it last stood for.
+    /// Its previous row.
     std::optional<std::size_t> lastRow;
 
     void setSelected(bool isSelected);

@@ -29,7 +29,7 @@ public:
     TableWidget();
     ~TableWidget() override;
 
-    /// Null once the table view is gone.
+    /// Null after the table view's destruction.
     TableView* view = nullptr;
     TableViewDataSource* dataSource = nullptr;
     TableViewDelegate* delegate = nullptr;
@@ -54,7 +54,7 @@ public:
     [[nodiscard]] std::optional<std::size_t> focusRow() const { return _focus; }
     void setSelectedRow(std::optional<std::size_t> row);
     void setPressedRow(std::optional<std::size_t> row);
-    /// Scrolls to it and tells a screen reader.
+    /// Scrolls to it and notifies a screen reader.
     void setFocusRow(std::optional<std::size_t> row);
     /// The focus frame is shown after keyboard use and hidden by the next click.
     void setShowsFocus(bool shows);

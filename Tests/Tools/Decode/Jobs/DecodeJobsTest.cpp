@@ -7,7 +7,7 @@
 
 #include <algorithm>
 
-// `decode --jobs`: several files side by side.
+// `decode --jobs`: several files in parallel.
 
 namespace velmora {
 namespace {
