@@ -32,7 +32,7 @@ class QWidget;
 
 namespace velmora {
 
-/// What the application stands on in a test: fakes in virtual time, and files in a directory of the test's.
+/// The application's platform in a test: fakes in virtual time, and files in a directory of the test's.
 class TestAppPlatform final : public AppPlatform {
 public:
     explicit TestAppPlatform(const LinuxFileSystem::Options& options) : linuxFiles(options) {}

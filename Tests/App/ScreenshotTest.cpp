@@ -27,7 +27,7 @@ struct Look {
     bool isDark;
 };
 
-/// Draws the screens as they stand on a synthetic drive into "screenshots" beside the tests.
+/// Draws the screens during a synthetic drive into "screenshots" beside the tests.
 class ScreenshotTest : public AppFixture, public testing::WithParamInterface<Look>, public LogSink {
 protected:
     ScreenshotTest() {

@@ -92,7 +92,7 @@ TEST_F(VelmoraAppTest, WithTheMarkerEveryPaneDoes) {
     EXPECT_TRUE(app.allowSaveButton());
     for (std::size_t i = 0; i < depth(); ++i)
         EXPECT_TRUE(offersSave(*pane(i))) << i;
-    // Gone again, which the next look at it finds.
+    // Removed again, which the next access finds.
     std::filesystem::remove_all(directory / "QuorraInternal");
     app.getSaveButtonPref();
     EXPECT_FALSE(app.allowSaveButton());
@@ -111,7 +111,7 @@ TEST_F(VelmoraAppTest, StatusGoesFromConnectingToTheTimeAndBack) {
     EXPECT_THAT(rows(*pane(0)), ElementsAre("A", "C"));
 
     loseService();
-    // Nothing was redrawn; a navigation shows how things stand.
+    // Nothing was redrawn; a navigation shows the current values.
     EXPECT_EQ(status(*pane(0)), "Updated 2026-11-16 at 06:00:02");
     clickRow(1);
     EXPECT_EQ(status(*topPane()), "Connecting...");

@@ -106,7 +106,7 @@ TEST(DLFReader, truncationInTheLastTwoRecordsLosesOnlyTheTruncatedOne) {
         }
         const std::size_t left = size - begin;
         const std::size_t length = begin == 193 ? 15 : 17;
-        // A record is known as one once its header is whole: 12 bytes, and a type byte before them.
+        // A record is recognised when its header is complete: 12 bytes, and a type byte before them.
         const std::size_t header = begin == 193 ? 12 : 13;
         const std::string reason =
             left < header

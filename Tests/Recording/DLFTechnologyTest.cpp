@@ -29,7 +29,7 @@ TEST(DLFTechnology, looksAMebibyteAheadForTheTechnology) {
     EXPECT_EQ(technologyAfter(18), "");
 }
 
-/// So many records of these codes in turn.
+/// This many records, of these codes one after another.
 Data recordsOf(std::initializer_list<std::uint16_t> codes, int rounds) {
     std::vector<std::uint8_t> bytes;
     std::uint64_t units = 0;

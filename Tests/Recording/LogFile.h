@@ -16,7 +16,7 @@
 
 namespace velmora {
 
-/// A record less its type byte, as it stands in a DLF log: length, code, time stamp, payload.
+/// A record less its type byte, as in a DLF log: length, code, time stamp, payload.
 [[nodiscard]] Data bareRecord(std::uint16_t code, std::string_view payloadHex, std::uint64_t timestamp = 0);
 /// As above with the type byte: the message as it arrives.
 [[nodiscard]] Data stampedRecord(std::uint16_t code, std::string_view payloadHex, std::uint64_t timestamp,

@@ -36,7 +36,7 @@ protected:
     Result<Done> append(std::uint8_t number) {
         return writer->append(Time(std::chrono::nanoseconds(number)), Bytes(&number, 1));
     }
-    /// The numbers of the messages on the disk, which must be whole.
+    /// The numbers of the messages on the disk, which must be complete.
     [[nodiscard]] std::vector<int> numbers() const {
         const auto reader =
             PcapngReader::open(ChunkedInput(std::make_unique<MemorySource>(Data::copyOf(medium.content))));

@@ -70,7 +70,7 @@ const std::string interfaceHex = R"(
     0000 0000           # end of options
     30000000)";
 
-/// The whole head, whatever the version's digits.
+/// The complete head, whatever the version's digits.
 std::string headHex() {
     const std::string version = VELMORA_TEST_VERSION;
     EXPECT_EQ(version.size(), 5U) << "the lengths in the expected section header are for five characters";

@@ -33,7 +33,7 @@ const std::vector<std::string> fourTexts{"1 at 76, 1 ns: A0A1A2A3A4", "2 at 116,
                                          "3 at 156, 1 ns: C0C1C2C3C4", "4 at 196, 1 ns: D0D1D2D3D4"};
 constexpr std::size_t fourSize = 236;
 
-/// The four without the one at `lost`; the numbers of those after it stand where it was not counted.
+/// The four without the one at `lost`; those after it keep their numbers unless it was not counted.
 std::vector<std::string> without(std::size_t lost) {
     std::vector<std::string> texts;
     for (std::size_t i = 0; i < fourTexts.size(); ++i) {

@@ -211,7 +211,7 @@ TEST(SnapshotReader, fallsBackToTheLogWithoutRawMessages) {
                             "record of 12 at least"));
     EXPECT_EQ(out.technology, "Ostrel_GSM");
 
-    // The same messages stand in the entries and in the log: they come once.
+    // The entries and the log have the same messages, which are read once.
     const ReadOut both =
         readAnyForm(snapshotFile({historyEntry(idle(), "2026-11-16 05:00:02 +0000"), dlfItem(log)}));
     EXPECT_THAT(both.messages, ElementsAre("1 at 0, " + at(0) + ": " + idleHex + ", refresh at " + at(2)));

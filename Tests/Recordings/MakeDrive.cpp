@@ -21,7 +21,7 @@
 namespace velmora {
 namespace {
 
-/// The whole of `text` as a number.
+/// All of `text` as a number.
 std::optional<std::uint64_t> numberOf(std::string_view text) {
     std::uint64_t number = 0;
     const auto result = std::from_chars(text.data(), text.data() + text.size(), number);

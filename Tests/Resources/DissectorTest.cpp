@@ -61,7 +61,7 @@ std::string momentText(Time moment) {
 }
 
 /// Technology, prefix, type, length, code, sections, record, time and payload as we read them, separated by
-/// tabs. A code that no decoder looks at is left out.
+/// tabs. A code without subscriber is skipped.
 std::string ourReading(const std::string& technology, Bytes message) {
     const std::string name = technology + "\t";
     const auto header = LogMessage::parse(message);

@@ -42,7 +42,7 @@ public:
     [[nodiscard]] Created createLocal(const std::string& name, MessageCallback callback) override;
     [[nodiscard]] std::shared_ptr<RemotePort> createRemote(const std::string& name) override;
 
-    /// The next `createLocal` gives no port.
+    /// The next `createLocal` returns no port.
     void failNextLocal();
     /// Whether a local port owns the name.
     [[nodiscard]] bool isTaken(const std::string& name) const;

@@ -24,7 +24,7 @@
 #include <string>
 #include <vector>
 
-// What every technology's drive leaves in each of the three forms, and what playing that gives.
+// Every technology's drive in each of the three forms, and the messages that replaying it sends.
 
 namespace velmora {
 namespace {
@@ -165,7 +165,7 @@ TEST_P(ReplayFormsTest, dlfLogOfManyBuffers) {
             continue;
         }
         wanted.push_back(event.message);
-        // A first message's wrong type byte is gone for good.
+        // A first message's wrong type byte is not stored.
         if (isFirst && event.message.bytes()[0] == 2)
             wanted.back() = joined(hex("01"), event.message.from(1));
     }

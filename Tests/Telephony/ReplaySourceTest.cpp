@@ -24,7 +24,7 @@ using namespace std::chrono_literals;
 using ::testing::ElementsAre;
 using ::testing::IsEmpty;
 
-/// What a file holds, as the test wants it.
+/// The content of a file, set by the test.
 struct FakeFile {
     std::string technology = "Ostrel_GSM";
     std::vector<std::pair<std::chrono::nanoseconds, Data>> messages; ///< by time since some hour

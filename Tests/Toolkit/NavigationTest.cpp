@@ -184,7 +184,7 @@ TEST_F(NavigationTest, WhatIsOnAStackCantBePushed) {
     EXPECT_THAT(titles(), ElementsAre("root"));
 }
 
-/// With the motion that the user wants.
+/// With animations enabled.
 class NavigationMotionTest : public NavigationTest {
 protected:
     NavigationMotionTest() { qunsetenv("VELMORA_REDUCED_MOTION"); }

@@ -36,7 +36,7 @@ void runUntilIdle();
 /// Its text: a label's or a button's.
 [[nodiscard]] std::string textOf(const QWidget* widget);
 
-/// While it lives, the user wants no motion.
+/// Turns reduced motion on during its lifetime.
 class ReducedMotion {
 public:
     ReducedMotion();

@@ -170,7 +170,7 @@ TEST_P(RoundTripTest, DLFLogHasTheRecords) {
         EXPECT_EQ(convert("drive.dlf"), 1) << "there is none";
         return;
     }
-    // All that a log can be followed through: a whole header, and a length field that is the length.
+    // What a log's record chain needs: a complete header, and a correct length field.
     std::vector<Data> expected;
     for (const TimedMessage& message : _drive) {
         const auto header = LogMessage::parse(message.message.bytes());

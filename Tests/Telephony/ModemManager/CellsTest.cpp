@@ -117,7 +117,7 @@ TEST_F(CellsTest, umts) {
 TEST_F(CellsTest, lte) {
     putModem(lteAccess);
     setCells({
-        // Another technology's cell does not stand in the way of the serving one.
+        // Another technology's cell does not hide the serving one.
         {{"cell-type", 6U}, {"serving", true}, {"tac", "7"}, {"ci", "123456789"}, {"nrarfcn", 431000U}},
         {{"cell-type", 5U},
          {"serving", true},

@@ -61,7 +61,7 @@ TEST(MemberTableTest, credentialsAreNeverUsed) {
     EXPECT_EQ(target.size(), 1U);
 }
 
-/// A conversion, what it is given and what it gives.
+/// A conversion, its argument and its result.
 struct Case {
     Value (*convert)(const Value&);
     Value given;

@@ -29,7 +29,7 @@ protected:
         std::filesystem::create_directory(path("out"));
     }
 
-    /// Runs `velmora-log convert` and gives its own words; its exit status has to be the one given.
+    /// Runs `velmora-log convert` and returns its messages; checks its exit status.
     std::string convert(std::vector<std::string> arguments, int status,
                         std::optional<std::string> input = std::nullopt) {
         arguments.insert(arguments.begin(), "convert");

@@ -164,7 +164,8 @@ TEST_F(DecodingTest, RefreshesRecordedInTheFileReplaceTheTicks) {
     EXPECT_THAT(refreshesOf(messages, told, {}),
                 ElementsAre(Refresh{at(1500), "RR_IDLE"}, Refresh{at(12'100), "RR_GOING_ACTIVE"},
                             Refresh{at(17'100), "RR_GOING_INACTIVE"}));
-    // A refresh whose latest message is not wanted shows those before; one without any is none.
+    // A refresh whose latest message is outside the range shows the earlier ones; without any there is no
+    // refresh.
     EXPECT_THAT(refreshesOf(messages, told, rangeOf(std::nullopt, at(1000))),
                 ElementsAre(Refresh{at(1500), "RR_PLMN_LIST_CONSTRUCTION"}));
 }

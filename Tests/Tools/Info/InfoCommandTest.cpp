@@ -18,13 +18,13 @@ TEST_F(InfoCommandTest, CountsMessagesByLogCodeWithTheirSections) {
     const std::vector<std::uint64_t> offsets =
         writeRecording("drive.pcapng", "Ostrel_GSM",
                        {
-                           {at(1250), rrState(4)},                           // 17 bytes
-                           {at(0), rrState(5)},                              // 17, the earliest
-                           {at(3600'001), joined(hex("81 00"), rrState(5))}, // 19, the latest
-                           {at(1300), record(0x1234, "")},                   // 13, which no section wants
-                           {at(1400), extraRecord(0, makeDictionary())},     // SIM files
-                           {at(1500), hex("01 02 03")},                      // 3, too short
-                           {at(1600), record(0x512C, "00", 2)},              // 14, of no known type
+                           {at(1250), rrState(4)},                                 // 17 bytes
+                           {at(0), rrState(5)},                                    // 17, the earliest
+                           {at(3600'001), joined(hex("81 00"), rrState(5))},       // 19, the latest
+                           {at(1300), record(0x1234, "")},                         // 13, without subscriber
+                           {at(1400), extraRecord(0, makeDictionary())},           // SIM files
+                           {at(1500), hex("01 02 03")},                            // 3, too short
+                           {at(1600), record(0x512C, "00", 2)},                    // 14, of no known type
                            {at(1700), hex("01 02 03 04 05 06 07 08 09 0A 0B 0C")}, // 12, too short
                        });
     const std::size_t simSize = extraRecord(0, makeDictionary()).size();
