@@ -9,11 +9,11 @@
 
 namespace velmora {
 
-/// What the application stands on: the machine's, or a test's. Main thread only.
+/// The application's platform: the machine's, or a test's. Main thread only.
 class AppPlatform {
 public:
     virtual ~AppPlatform() = default;
-    /// What the model asks of the machine; its queue and clock are the screens' too.
+    /// The model's platform; the screens use its queue and clock too.
     [[nodiscard]] virtual ModelPlatform model() = 0;
     [[nodiscard]] virtual FileSystem& files() = 0;
     [[nodiscard]] virtual Preferences& preferences() = 0;

@@ -9,12 +9,12 @@
 
 namespace velmora {
 
-/// Writes moments in local time after a pattern: yyyy, MM, dd, HH, mm and ss stand for year, month, day,
-/// hour, minute and second with leading zeros; text between apostrophes, and whatever is no letter, stands
-/// for itself, and two apostrophes for one. A field of another name stands for itself too.
+/// Formats times in local time by a pattern: yyyy, MM, dd, HH, mm and ss are replaced by year, month, day,
+/// hour, minute and second with leading zeros; text between apostrophes, everything but letters, and fields
+/// of other names are copied; two apostrophes give one.
 class DateFormatter {
 public:
-    /// `clock` gives the zone and must outlive the formatter.
+    /// `clock` has the time zone and must outlive the formatter.
     DateFormatter(const Clock& clock, std::string pattern);
 
     [[nodiscard]] std::string stringFromDate(Time moment) const;

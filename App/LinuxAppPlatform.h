@@ -19,7 +19,7 @@
 
 namespace velmora {
 
-/// The machine that the application runs on. Main thread only; stands on the application's event loop.
+/// The machine as the application's platform. Main thread only; uses the application's event loop.
 class LinuxAppPlatform final : public AppPlatform {
 public:
     /// Makes the directory for snapshots where it is the standard one. `portName` is the application's own.

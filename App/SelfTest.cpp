@@ -29,7 +29,7 @@ void SelfTest::step() {
     }
     switch (_stage) {
     case Stage::Waiting: {
-        // Asking the model for its tree would have the decoder keep a display that nobody has seen.
+        // Reading the model's tree would add a display to the history that was never shown.
         auto& root = static_cast<VelmoraPaneController&>(*_app.navController().viewControllers().front());
         if (root.numberOfRowsInSection(root.tableView(), 0) > 0)
             _stage = Stage::Panes;

@@ -13,7 +13,7 @@
 
 namespace velmora {
 
-/// The application's test of itself: waits for the first data, opens every pane that they make and the save
+/// The application's self-test: waits for the first data, opens every pane that they make and the save
 /// screen, as a user would, and ends the application: with status 0, or with 1 and an error line where no
 /// data came in time or a screen did not open. Main thread only.
 class SelfTest {

@@ -98,7 +98,7 @@ void VelmoraApp::updateStatusForViewController(VelmoraPaneController& pane) {
 }
 
 void VelmoraApp::updateViewControllerFromModel() {
-    // Only panes are ever put on the stack. Popping changes it, so it is walked as it stood.
+    // Only panes are ever put on the stack. Popping changes it, so the loop runs over a copy.
     const std::vector<std::shared_ptr<ViewController>> panes = _navController->viewControllers();
     for (std::size_t i = 0; i < panes.size(); ++i) {
         auto& pane = static_cast<VelmoraPaneController&>(*panes[i]);

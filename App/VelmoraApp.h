@@ -32,7 +32,7 @@ class VelmoraApp final : public Application,
 public:
     using PlatformMaker = std::function<std::unique_ptr<AppPlatform>()>;
 
-    /// `makePlatform` is called once the event loop is there for the platform to stand on.
+    /// `makePlatform` is called once the event loop exists, which the platform needs.
     VelmoraApp(int& argc, char** argv, const PlatformMaker& makePlatform);
     ~VelmoraApp() override;
 
@@ -41,8 +41,8 @@ public:
     [[nodiscard]] int run() { return run(*this); }
 
     void applicationDidFinishLaunching(Application& application) override;
-    /// Has no argument, so the toolkit's notice never reaches it, and nothing else calls it: the preference
-    /// is not reset at exit. That is meant.
+    /// Has no argument, so the toolkit never calls it, nor does anything else: the preference is not reset at
+    /// exit. That is intended.
     void applicationWillTerminate();
     /// The toolkit's notice does nothing here.
     using ApplicationDelegate::applicationWillTerminate;
@@ -52,9 +52,9 @@ public:
     /// Switches the home screen's display of the received signal strength.
     void _setGSMRSSI(bool isShown);
 
-    /// Opens the save screen; nothing while there is one.
+    /// Opens the save screen; does nothing while it is open.
     void showSaveView();
-    /// Closes the save screen; nothing without one.
+    /// Closes the save screen; does nothing when it is not open.
     void closeSaveView();
 
     void updateStatusForViewController(VelmoraPaneController& pane);

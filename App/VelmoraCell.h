@@ -32,7 +32,7 @@ public:
     [[nodiscard]] Label& key() { return *_key; }
     /// The leaf's value; null in a cell made for inner rows.
     [[nodiscard]] Label* value() { return _value.get(); }
-    /// What holds both; null in a cell made for inner rows.
+    /// The view of both; null in a cell made for inner rows.
     [[nodiscard]] ScrollView* view() { return _view.get(); }
 
     /// Lays the cell out for an inner row, now and whenever its size changes.

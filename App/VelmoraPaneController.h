@@ -26,10 +26,10 @@ public:
     [[nodiscard]] const std::string& path() const { return _keyPath; }
 
     void viewWillAppear(bool animated) override;
-    /// Only gives the keyboard up. The base does not hear of it; that is meant.
+    /// Only releases the keyboard focus, without calling the base; that is intended.
     void viewWillDisappear(bool animated) override;
 
-    /// Shows the status (an absent one as an empty text), and whether something is under way.
+    /// Shows the status (an absent one as an empty text), and whether something is in progress.
     void setStatus(std::optional<std::string_view> status, bool isLoading);
     /// Shows another node (or none) under the same path.
     void reloadWithNode(NodeRef node);

@@ -39,7 +39,7 @@ void VelmoraSaveView::layoutSubviews() {
     const double side = std::max(cancel.width, save.width) + 2 * margin;
     _cancel.setFrame({x + margin, y + margin, cancel.width, rowHeight});
     _save.setFrame({x + width - margin - save.width, y + margin, save.width, rowHeight});
-    // As wide on both sides, so that it stands in the middle.
+    // The same margin on both sides centres it.
     _heading.setFrame({x + side, y + margin, std::max(0.0, width - 2 * side), rowHeight});
 
     const double fieldTop = y + margin + rowHeight + margin;

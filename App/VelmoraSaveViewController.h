@@ -35,7 +35,7 @@ public:
     [[nodiscard]] TextField& saveDescription() { return _saveDescription; }
 
     void viewDidLoad() override;
-    /// Only takes the screen's room up. The base does not hear of it; that is meant.
+    /// Only fills the screen, without calling the base; that is intended.
     void viewWillAppear(bool animated) override;
     void didReceiveMemoryWarning() override;
     void viewDidUnload() override;
@@ -50,7 +50,7 @@ public:
     [[nodiscard]] std::size_t numberOfRowsInSection(TableView& tableView, std::size_t section) override;
     [[nodiscard]] std::shared_ptr<TableCell> cellForRowAtIndexPath(TableView& tableView,
                                                                    const IndexPath& indexPath) override;
-    /// Only takes the keyboard away: every entry is always saved, none can be chosen.
+    /// Only releases the keyboard focus: every entry is always saved, none can be chosen.
     void didSelectRowAtIndexPath(TableView& tableView, const IndexPath& indexPath) override;
 
 protected:

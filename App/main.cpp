@@ -5,7 +5,7 @@
 #include "App/SelfTest.h"
 #include "App/VelmoraApp.h"
 #include "Platform/Linux/Files/FileResources.h"
-#include "Platform/Linux/Files/LargeMemory.h"
+#include "Platform/Linux/Files/LargeAllocations.h"
 #include "Platform/Linux/Files/LinuxFileSystem.h"
 #include "Platform/Linux/ProgramLog.h"
 #include "Platform/Linux/ServiceStarter.h"
@@ -59,7 +59,7 @@ void declare(CLI::App& app, Options& options) {
         ->check(CLI::Range(0, 7))
         ->capture_default_str();
     app.add_flag("--start-service", options.startsService,
-                 "Bring up the telephony service first where none is running");
+                 "Start the telephony service first where none is running");
     app.add_flag("--self-test", options.isSelfTest, "Open every screen on the first data, then exit");
     app.footer("Velmora shows what a telephony service sends. With a synthetic drive as the service:\n"
                "  velmora-telephonyd --source scenario:gsm,seed=1 &\n"
@@ -79,7 +79,7 @@ int show(const Options& options, char* program) {
                    [&options] { return std::make_unique<LinuxAppPlatform>(options.files); });
     if (options.startsService) {
         // Before the first attempt to connect, since the next one comes seconds later.
-        if (const auto up = bringUpTelephonyService(); !up)
+        if (const auto up = startTelephonyService(); !up)
             logFormat(LogPriority::Error, "telephony service: %s", up.reason().c_str());
     }
     app.platform().model().queue.after(serviceDelay, [&app] {
@@ -98,7 +98,7 @@ int show(const Options& options, char* program) {
 
 int main(int argc, char** argv) {
     endOnUncaughtExceptions("velmora");
-    giveBackLargeMemory();
+    returnLargeAllocations();
     Options options;
     CLI::App app;
     declare(app, options);

@@ -33,8 +33,8 @@
 
 // What the application costs beside the floor of a bare Qt window with a table of as many rows, in the same
 // run: start to the first painted window, memory, and a redraw of 400 rows whose values have all changed.
-// Each start is a process of its own. Then, with "--flood SECONDS" and velmora-telephonyd sending as fast as
-// it was told to, how late the event loop is.
+// Each start is a process of its own. Then, with "--flood SECONDS" and velmora-telephonyd sending at a speed
+// of its own, the event loop's latency.
 //
 //   QT_QPA_PLATFORM=offscreen bench-application
 //   velmora-telephonyd --source scenario:gsm,seed=1,speed=520 &

@@ -47,7 +47,7 @@ public:
 
 void framingAndRouting(benchmark::State& state) {
     Decoder decoder;
-    const Data message = record(0x1234, "00 01 02 03"); // a code that no section wants
+    const Data message = record(0x1234, "00 01 02 03"); // a code without subscriber
     for (auto step : state)
         decoder.generator.updateWithData(message);
     state.SetItemsProcessed(state.iterations());
@@ -56,7 +56,7 @@ BENCHMARK(framingAndRouting);
 
 void routingToFourSections(benchmark::State& state) {
     Decoder decoder;
-    const Data message = record(0x7132, "01 00 00"); // registration: wanted by four sections
+    const Data message = record(0x7132, "01 00 00"); // registration: four sections subscribe
     for (auto step : state)
         decoder.generator.updateWithData(message);
     state.SetItemsProcessed(state.iterations());

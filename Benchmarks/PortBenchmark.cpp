@@ -78,7 +78,7 @@ void oneWayMessages(benchmark::State& state) {
     for (auto _ : state) {
         for (int i = 0; i < batch; ++i)
             port->post(0, payload);
-        // The answer to a request that stands behind the messages: all of them have been taken.
+        // The reply to a request that follows the messages: all of them have been received.
         if (port->sendRequest(0, payload, 10s, 10s, true).status != PortStatus::Success)
             state.SkipWithError("the receiver does not answer");
     }

@@ -117,7 +117,7 @@ constexpr Weight everyWeight[] = {
     {"farTimestamp", &RecordWeights::farTimestamp},
     {"badTimestamp", &RecordWeights::badTimestamp},
     {"endOfInput", &RecordWeights::endOfInput},
-    {"goodEnd", &RecordWeights::goodEnd},
+    {"goodFollower", &RecordWeights::goodFollower},
     {"expected", &RecordWeights::expected},
     {"sure", &RecordWeights::sure},
 };

@@ -2,8 +2,8 @@
 // SPDX-License-Identifier: MIT
 
 #include "Recording/Files/DescriptorFile.h"
-#include "Recording/Pcapng/RecordingReader.h"
-#include "Recording/Pcapng/RecordingWriter.h"
+#include "Recording/Pcapng/PcapngReader.h"
+#include "Recording/Pcapng/PcapngWriter.h"
 
 #include <algorithm>
 #include <chrono>
@@ -48,7 +48,7 @@ void require(bool good) {
         std::abort();
 }
 
-void write(RecordingWriter& writer, std::size_t count) {
+void write(PcapngWriter& writer, std::size_t count) {
     const std::vector<std::uint8_t> message(messageSize, 0x5A);
     for (std::size_t i = 0; i < count; ++i)
         require(bool(writer.append(Time(std::chrono::nanoseconds(i)), message)));
@@ -57,7 +57,7 @@ void write(RecordingWriter& writer, std::size_t count) {
 const std::vector<std::uint8_t>& recording() {
     static const std::vector<std::uint8_t> bytes = [] {
         const int file = ::memfd_create("recording", 0);
-        auto writer = RecordingWriter::adopt(::dup(file), "memory", "Ostrel_LTE");
+        auto writer = PcapngWriter::adopt(::dup(file), "memory", "Ostrel_LTE");
         write(**writer, messageCount);
         require(bool((*writer)->close()));
         std::vector<std::uint8_t> content(static_cast<std::size_t>(::lseek(file, 0, SEEK_END)));
@@ -74,7 +74,7 @@ void countMessages(benchmark::State& state, std::size_t count) {
 
 void BM_Write(benchmark::State& state) {
     for (auto _ : state) {
-        auto writer = RecordingWriter::create("/dev/null", "Ostrel_LTE");
+        auto writer = PcapngWriter::create("/dev/null", "Ostrel_LTE");
         write(**writer, messageCount);
     }
     countMessages(state, messageCount);
@@ -85,7 +85,7 @@ BENCHMARK(BM_Write)->Unit(benchmark::kMillisecond);
 template <class Use>
 void read(benchmark::State& state, Use use) {
     for (auto _ : state) {
-        auto reader = RecordingReader::open(ChunkedInput(std::make_unique<MemorySource>(recording())));
+        auto reader = PcapngReader::open(ChunkedInput(std::make_unique<MemorySource>(recording())));
         while (std::optional<LoggedMessage> message = (*reader)->next())
             use(*std::move(message));
     }
@@ -117,7 +117,7 @@ void BM_ReadHolding(benchmark::State& state) {
 }
 BENCHMARK(BM_ReadHolding)->Unit(benchmark::kMillisecond);
 
-/// How long a recorder's event loop stands still to have 64 KiB put on the disk of the working directory.
+/// How long syncing 64 KiB to the disk of the working directory blocks a recorder's event loop.
 template <class Save>
 void save(benchmark::State& state, Save save) {
     const std::string path = "recording-benchmark-" + std::to_string(::getpid());

@@ -55,8 +55,8 @@ private:
     Value _template; ///< none where the technology has none
 };
 
-/// A reconnection makes a decoder, which takes the time of many messages. Those of a script beyond these are
-/// left out.
+/// A reconnection makes a decoder, which takes the time of many messages. Further ones in a script are
+/// ignored.
 inline constexpr int maximumReconnects = 3;
 
 /// A decoder and its state. Both are at their beginning.
@@ -69,11 +69,11 @@ public:
     /// cannot be read, and what a serialized-object baseband must not send.
     [[nodiscard]] bool update(const Data& message);
     void redraw();
-    /// Another decoder goes on with the same state.
+    /// Another decoder continues with the same state.
     void reconnect() { _decoder = _maker.newDecoder(); }
 
     [[nodiscard]] Dictionary& state() { return *_state; }
-    /// As it stands, none before it has been built.
+    /// The current one; none before the first has been built.
     [[nodiscard]] Value display() { return _decoder->display(*_state); }
     [[nodiscard]] const LogGenerator& decoder() const { return *_decoder; }
 

@@ -12,9 +12,9 @@
 
 namespace velmora {
 
-/// Messages of a scenario's drive: the first `each` of every log code and of every way in which a message may
-/// be odd about its framing, in the order in which they come, out of so much time. All of a technology whose
-/// messages are no records count as of one code.
+/// Messages of a scenario's drive: the first `each` of every log code and of every kind of unusual framing,
+/// in the order in which they come, out of so much time. All of a technology whose messages are no records
+/// count as of one code.
 [[nodiscard]] std::vector<Data> driveMessages(std::string_view scenario, std::chrono::seconds duration,
                                               std::size_t each);
 

@@ -3,7 +3,7 @@
 
 #include "Fuzz/FuzzTargets.h"
 #include "Recording/DLF/DLFReader.h"
-#include "Recording/Pcapng/RecordingReader.h"
+#include "Recording/Pcapng/PcapngReader.h"
 #include "Recording/Snapshots/SnapshotReader.h"
 #include "Tests/Recording/PcapngFile.h"
 
@@ -29,8 +29,9 @@ bool same(const Contents& a, const Contents& b) {
                one.refresh == other.refresh && one.message == other.message;
     };
     const auto sameLoss = [](const Loss& one, const Loss& other) {
-        return one.offset == other.offset && one.bytes == other.bytes && one.isTail == other.isTail &&
-               one.recordNumber == other.recordNumber && one.reason == other.reason;
+        return one.offset == other.offset && one.bytes == other.bytes &&
+               one.isTruncation == other.isTruncation && one.recordNumber == other.recordNumber &&
+               one.reason == other.reason;
     };
     return a.failure == b.failure && a.technology == b.technology && a.totals.losses == b.totals.losses &&
            a.totals.bytes == b.totals.bytes &&
@@ -39,8 +40,8 @@ bool same(const Contents& a, const Contents& b) {
            std::equal(a.losses.begin(), a.losses.end(), b.losses.begin(), b.losses.end(), sameLoss);
 }
 
-/// The input's first byte tells in how long pieces the source gives the rest, which is a file of the reader's
-/// form. `hasOffsets`: offsets are places in the file, and messages its bytes.
+/// The input's first byte sets the size of the source's reads from the rest, which is a file of the reader's
+/// form. `hasOffsets`: offsets are positions in the file, and messages its bytes.
 template <class Reader>
 class FileTarget final : public FuzzTarget {
 public:
@@ -107,8 +108,8 @@ private:
                     "a loss lies in its file");
     }
 
-    /// The message as it stands at the place that its offset names, or behind it. A record of a DLF log gets
-    /// back the byte that it was written without.
+    /// The message as it is at its offset, or after it. A record of a DLF log gets back the byte that it was
+    /// written without.
     static Bytes contentIn(Bytes message, Bytes place) {
         const auto begins = [place](Bytes content) {
             return content.size() <= place.size() &&
@@ -131,7 +132,7 @@ private:
 } // namespace
 
 std::unique_ptr<FuzzTarget> makeRecordingTarget() {
-    return std::make_unique<FileTarget<RecordingReader>>(true);
+    return std::make_unique<FileTarget<PcapngReader>>(true);
 }
 
 std::unique_ptr<FuzzTarget> makeDLFTarget() {

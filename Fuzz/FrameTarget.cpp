@@ -13,11 +13,11 @@ namespace {
 
 /// What a reader gave for a stream.
 struct Taken {
-    std::vector<std::uint8_t> frames; ///< encoded again, one behind the other
+    std::vector<std::uint8_t> frames; ///< encoded again, one after another
     std::string failure;
 };
 
-/// The input's first byte tells how long the pieces are in which the rest arrives.
+/// The input's first byte sets the size of the parts in which the rest arrives.
 class FrameTarget final : public FuzzTarget {
 public:
     void run(Bytes input) override {

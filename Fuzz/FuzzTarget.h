@@ -10,8 +10,8 @@
 
 namespace velmora {
 
-/// Something that is fed with hostile input. A fuzzer makes one and calls `run` for every input; the tests
-/// feed it what fuzzers once found. What one input leaves behind must not reach the next. Main thread only.
+/// Code under fuzzing. A fuzzer makes one and calls `run` for every input; the tests run former findings.
+/// State must not carry over from one input to the next. Main thread only.
 class FuzzTarget {
 public:
     FuzzTarget() = default;
@@ -19,21 +19,21 @@ public:
     FuzzTarget(const FuzzTarget&) = delete;
     FuzzTarget& operator=(const FuzzTarget&) = delete;
 
-    /// Feeds it one input. It is to return whatever the input holds: an exception that escapes is a finding,
-    /// as is a crash, a hang, memory without bound and what the sanitizers report.
+    /// Runs one input. It must return for any input: an exception that escapes is a finding, as is a crash, a
+    /// hang, memory without bound and what the sanitizers report.
     virtual void run(Bytes input) = 0;
 };
 
-/// What a target did with an input, though not amiss by itself, is not what it promises.
-class BrokenPromise : public std::runtime_error {
+/// An invariant of a target is violated.
+class BrokenInvariant : public std::runtime_error {
 public:
     using std::runtime_error::runtime_error;
 };
 
-/// Raises BrokenPromise with the promise's words unless it holds.
-inline void require(bool holds, const char* promise) {
+/// Throws BrokenInvariant with the invariant's text unless it holds.
+inline void require(bool holds, const char* invariant) {
     if (!holds)
-        throw BrokenPromise(promise);
+        throw BrokenInvariant(invariant);
 }
 
 } // namespace velmora

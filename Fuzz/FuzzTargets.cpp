@@ -3,26 +3,26 @@
 
 #include "Fuzz/FuzzTargets.h"
 
-#include "Fuzz/FuzzMaterials.h"
+#include "Fuzz/FuzzCorpora.h"
 
 namespace velmora {
 
 namespace {
 
 constexpr FuzzTargetKind kinds[] = {
-    {"property-list", makePropertyListTarget, propertyListMaterial, 2048},
-    {"ostrel-gsm", makeOstrelGSMTarget, [] { return decoderMaterial("gsm"); }},
-    {"lte", makeLTETarget, [] { return decoderMaterial("lte"); }},
-    {"utran", makeUTRANTarget, [] { return decoderMaterial("utran"); }},
-    {"c2k", makeC2KTarget, [] { return decoderMaterial("c2k"); }},
-    {"ifx", makeIFXTarget, [] { return decoderMaterial("ifx"); }, 2048},
-    {"same-labels", makeSameLabelsTarget, sameLabelsMaterial, 2048},
-    {"template", makeTemplateTarget, templateMaterial, 4096},
-    {"frame", makeFrameTarget, frameMaterial},
-    {"recording", makeRecordingTarget, recordingMaterial, 1536},
-    {"dlf", makeDLFTarget, dlfMaterial},
-    {"snapshot", makeSnapshotTarget, snapshotMaterial, 6144},
-    {"source-string", makeSourceStringTarget, sourceStringMaterial, 128},
+    {"property-list", makePropertyListTarget, propertyListCorpus, 2048},
+    {"ostrel-gsm", makeOstrelGSMTarget, [] { return decoderCorpus("gsm"); }},
+    {"lte", makeLTETarget, [] { return decoderCorpus("lte"); }},
+    {"utran", makeUTRANTarget, [] { return decoderCorpus("utran"); }},
+    {"c2k", makeC2KTarget, [] { return decoderCorpus("c2k"); }},
+    {"ifx", makeIFXTarget, [] { return decoderCorpus("ifx"); }, 2048},
+    {"same-labels", makeSameLabelsTarget, sameLabelsCorpus, 2048},
+    {"template", makeTemplateTarget, templateCorpus, 4096},
+    {"frame", makeFrameTarget, frameCorpus},
+    {"recording", makeRecordingTarget, recordingCorpus, 1536},
+    {"dlf", makeDLFTarget, dlfCorpus},
+    {"snapshot", makeSnapshotTarget, snapshotCorpus, 6144},
+    {"source-string", makeSourceStringTarget, sourceStringCorpus, 128},
 };
 
 } // namespace

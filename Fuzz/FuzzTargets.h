@@ -12,18 +12,18 @@
 
 namespace velmora {
 
-/// What a fuzzer starts from.
-struct FuzzMaterial {
-    std::vector<Data> seeds;  ///< good inputs, small ones
-    std::vector<Data> tokens; ///< words that are worth putting into an input; at most 64 bytes each
+/// A seed corpus with a dictionary of tokens.
+struct FuzzCorpus {
+    std::vector<Data> seeds;  ///< small valid inputs
+    std::vector<Data> tokens; ///< tokens for mutation; at most 64 bytes each
 };
 
-/// A target that there is: one line in the registry's list.
+/// An entry of the registry's list.
 struct FuzzTargetKind {
     std::string_view name;
     std::unique_ptr<FuzzTarget> (*make)();
-    FuzzMaterial (*material)(); ///< the same whenever it is called
-    /// How long inputs get: enough for all that a target does, since longer ones only cost time.
+    FuzzCorpus (*corpus)(); ///< the same whenever it is called
+    /// The maximum input length: enough for everything that a target does.
     std::size_t maximumLength = 1024;
 };
 

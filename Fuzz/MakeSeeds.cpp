@@ -40,9 +40,9 @@ void write(const FuzzTargetKind& target, const fs::path& directory) {
     const fs::path seeds = directory / target.name;
     fs::remove_all(seeds);
     fs::create_directories(seeds);
-    const FuzzMaterial material = target.material();
+    const FuzzCorpus corpus = target.corpus();
     std::size_t number = 0;
-    for (const Data& seed : material.seeds) {
+    for (const Data& seed : corpus.seeds) {
         if (seed.size() > target.maximumLength)
             continue; // the tests go through those; the engine would cut them in the middle
         const Bytes bytes = seed.bytes();
@@ -50,7 +50,7 @@ void write(const FuzzTargetKind& target, const fs::path& directory) {
             .write(reinterpret_cast<const char*>(bytes.data()), static_cast<std::streamsize>(bytes.size()));
     }
     std::ofstream dictionary = create(directory / std::string(target.name).append(".dict"));
-    for (const Data& token : material.tokens)
+    for (const Data& token : corpus.tokens)
         dictionary << '"' << escaped(token.bytes()) << "\"\n";
     std::printf("%.*s %zu\n", static_cast<int>(target.name.size()), target.name.data(), target.maximumLength);
 }

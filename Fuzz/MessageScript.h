@@ -11,17 +11,17 @@
 
 namespace velmora {
 
-/// What an input has a decoder do, step after step. Any bytes are a script: a step begins with a byte whose
-/// remainder by 6 tells its kind, and what is cut off by the script's end is taken as far as it goes.
+/// A decoder's steps as an input. Any bytes are a script: a step starts with a byte whose remainder by 6 is
+/// its kind, and a truncated step is used as far as it goes.
 ///
 ///     0  a record of the baseband's stream: u16 log code, u16 payload length, payload
 ///     1  one of the telephony service's extra stream, likewise
-///     2  as 0, behind the prefix 81 00
+///     2  as 0, after the prefix 81 00
 ///     3  a message as it stands: u16 length, bytes
 ///     4  a redraw
 ///     5  a reconnection: another decoder goes on with the same state
 ///
-/// Numbers are little-endian. A record's header tells its length and has no time stamp.
+/// Numbers are little-endian. A record's header has its length and no time stamp.
 class MessageScript {
 public:
     enum class Kind : std::uint8_t { Message, Redraw, Reconnect };

@@ -9,8 +9,8 @@
 
 namespace velmora {
 
-/// For as long as it lives, the process's log lines of error priority are composed, since they show what the
-/// input holds, and go nowhere, as does what classes print on the console. Main thread only.
+/// During its lifetime the process's log lines of error priority are formatted, since they use the input, and
+/// discarded, as is what classes print on the console. Main thread only.
 class QuietProcess {
 public:
     QuietProcess();

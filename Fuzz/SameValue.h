@@ -7,8 +7,7 @@
 
 namespace velmora {
 
-/// Whether two values show and are saved the same. Unlike ==, it takes a real that is no number for one that
-/// is none either.
+/// Whether two values are shown and saved the same. Unlike ==, it treats NaN as equal to NaN.
 [[nodiscard]] bool sameValue(const Value& a, const Value& b);
 
 } // namespace velmora

@@ -13,13 +13,13 @@ namespace velmora {
 ///
 /// Nested takes on one thread are counted in eight bits, and the mutex is released only when the count comes
 /// back to 0. So a nested pair leaves the mutex acquired once more than it is released, and 256 nested takes
-/// wrap the count to 0. That is meant: every user runs on the main thread and the mutex is recursive.
+/// wrap the count to 0. That is intended: every user runs on the main thread and the mutex is recursive.
 class ArrayLock {
 public:
     static void lockArray();
     static void unlockArray();
 
-    /// The number of takes that have not been given back, modulo 256.
+    /// The number of nested locks, modulo 256.
     [[nodiscard]] static std::uint8_t depth();
 
     /// Takes the lock for a scope.
@@ -38,7 +38,7 @@ private:
         std::recursive_mutex mutex;
         std::uint8_t depth = 0;
     };
-    /// Creates the mutex and the count on first use, once.
+    /// Lazily creates the mutex and the count, once.
     static State& initialize();
 };
 

@@ -24,7 +24,8 @@ class Base;
 
 /// Section name to section. The class index owns the sections.
 using ClassDictionary = std::map<std::string, Base*, std::less<>>;
-/// Log code as a decimal string ("53472") to the sections that want it, in the order of their registration.
+/// Log code as a decimal string ("53472") to the sections that subscribe to it, in the order of their
+/// registration.
 using CodeDictionary = std::map<std::string, std::vector<Base*>, std::less<>>;
 
 /// A section: one block of the measurement screen. It names itself, says by its views which log codes it
@@ -49,15 +50,15 @@ public:
     [[nodiscard]] virtual std::span<const View> views() const = 0;
     /// The codes of the views, in their order.
     [[nodiscard]] std::vector<std::uint32_t> getLogCodeArray() const;
-    /// Takes one record (without the optional prefix) that was routed here under `logCode`. What is
-    /// malformed is logged and dropped, and the node keeps its earlier values.
+    /// Takes one record (without the optional prefix) that was routed here under `logCode`. Malformed records
+    /// are logged and dropped, and the node keeps its earlier values.
     virtual void updateWithData(const Data& data, std::uint32_t logCode);
 
     /// Names the fields of a record of the view to the visitor, in the order in which they are shown.
     /// Precondition: the record was accepted by `updateWithData`. Not overriding it names the view's table.
     virtual void decode(const View& view, const Record& record, FieldVisitor& visitor) const;
 
-    /// Hands the section its node, a dictionary or an array.
+    /// Sets the section's node, a dictionary or an array.
     void updateSectionRef(const Value& node);
     /// The node with all that has arrived; none before the display is built and once it is gone.
     [[nodiscard]] Value node();
@@ -72,8 +73,8 @@ public:
     static void replaceArray(Array& array, const Array& newElements);
 
     /// Whole dB, 0 down to -31, of an unsigned linear Ec/No on a scale where 524288 (2^19) is 0 dB.
-    /// Thresholds of the modem's own table; its last two rows both give -31, and 705 and below give 0, on
-    /// purpose.
+    /// Thresholds of the modem's own table; its last two rows both return -31, and 705 and below return 0, as
+    /// intended.
     [[nodiscard]] static std::int16_t lookUpECNO(std::uint32_t value);
 
 protected:

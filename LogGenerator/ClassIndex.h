@@ -15,9 +15,9 @@
 
 namespace velmora {
 
-/// A technology's registry: section names to sections, and log codes to the sections that want them. It owns
-/// the sections. A technology's subclass is the list of them, one field a section; sections that share a log
-/// code are called in the order of the fields.
+/// A technology's registry: section names to sections, and log codes to their subscribers. It owns the
+/// sections. A technology's subclass is the list of them, one field a section; sections that share a log code
+/// are called in the order of the fields.
 class ClassIndex {
 public:
     /// A section of the index, which makes it. The field is all that a technology says of it:
@@ -44,9 +44,9 @@ public:
 
     /// The section registered under the name, or null.
     [[nodiscard]] Base* getClass(std::string_view name) const;
-    /// The sections that want the code, in calling order; null when none does.
+    /// The subscribers of the code, in calling order; null when there are none.
     [[nodiscard]] const std::vector<Base*>* getSubscribers(std::uint32_t code) const;
-    /// Every wanted code as a decimal string.
+    /// Every subscribed code as a decimal string.
     [[nodiscard]] std::vector<std::string> getAllLogCodes() const;
     /// What the sections read the cell information array with.
     [[nodiscard]] CellList& cellList() const { return *_cellList; }

@@ -14,11 +14,11 @@ namespace velmora {
 class MessageEffects;
 
 /// A technology's log decoder, as the model speaks to it. Decoders keep what they decode in the state
-/// dictionary that every call is given: the model owns it and it outlives them, so that a new decoder starts
-/// with what the earlier one left there. Main thread only.
+/// dictionary that every call is given: the model owns it and it outlives them, so that a new decoder
+/// continues from the earlier one's values. Main thread only.
 ///
 /// State keys that every decoder uses: "Display" (the latest display dictionary), "DisplayState" (the raw
-/// material of the latest display), "ExtraInfo" (a dictionary of extra values), "History" (see
+/// messages of the latest display), "ExtraInfo" (a dictionary of extra values), "History" (see
 /// updateHistoryInState).
 class LogGenerator {
 public:
@@ -30,8 +30,7 @@ public:
 
     /// Decodes one log message into the state. Called for every message.
     virtual void updateState(Dictionary& state, const Data& data) = 0;
-    /// `updateState`, and tells what the message concerned. A decoder that does not override this tells of
-    /// the display as a whole.
+    /// `updateState`, and reports what the message concerned. The default reports the entire display.
     virtual void updateStateTelling(Dictionary& state, const Data& data, MessageEffects& effects);
     /// The display for the current state, or none when there is nothing to show yet; appends a history entry.
     /// Called once per redraw with new data.
@@ -45,9 +44,8 @@ public:
     /// What a snapshot saves: dictionaries that each hold a "Description" string.
     [[nodiscard]] virtual ArrayRef getSaveContentsFromState(const Dictionary& state) const = 0;
 
-    /// Whether every refresh is kept in the history, for a snapshot, as it is unless this says otherwise. Who
-    /// looks at nothing but the display does without: "DisplayState" and "History" then stay as they are, and
-    /// a refresh copies nothing.
+    /// Whether every refresh is kept in the history, for a snapshot; the default is yes. Without it
+    /// "DisplayState" and "History" are not changed, and a refresh copies nothing.
     void setKeepsHistory(bool keeps) { _keepsHistory = keeps; }
 
     /// A new decoder for the technology that the telephony service names by one of its constants; null for
@@ -57,7 +55,7 @@ public:
 
     /// Appends an entry to the state's "History", an array of at most 5, oldest first. An entry holds frozen
     /// copies of "DisplayState", "Display" and "ExtraInfo", then "Date" and "Description", in this order, and
-    /// ends before the first that is missing, so that it never has a hole.
+    /// ends before the first missing one, so that it never has a gap.
     static void updateHistoryInState(Dictionary& state, const Clock& clock);
 
 protected:

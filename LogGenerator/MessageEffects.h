@@ -11,20 +11,18 @@
 
 namespace velmora {
 
-/// Is told what one log message concerned, by the decoder that has just decoded it: for tools that show a
-/// drive message by message. A message gives exactly one of `sections`, `values` and `display`, by the
-/// decoder's kind, also where it was dropped. Values and nodes are the decoder's own: they change with the
-/// next message. Main thread only.
+/// Observes what each log message concerned, for tools that show a drive message by message. A decoder calls
+/// exactly one of `sections`, `values` and `display` a message, also for a dropped one. Values and nodes are
+/// the decoder's own: they change with the next message. Main thread only.
 class MessageEffects {
 public:
     virtual ~MessageEffects() = default;
 
-    /// The sections that want the message's code follow, in calling order, each once. The code is the one by
+    /// The subscribers of the message's code follow, in calling order, each once. The code is the one by
     /// which the record was routed, 0xFF0000 added for the extra stream; absent where the message was
     /// dropped.
     virtual void sections(std::optional<std::uint32_t> code) = 0;
-    /// A section and its node as it stands after the message. A section that the display has no node for is
-    /// not told of.
+    /// A section and its node after the message. A section without a node is not reported.
     virtual void section(std::string_view name, const Value& node) = 0;
 
     /// The values that the message published follow, in publishing order; the code as above.

@@ -19,14 +19,14 @@ public:
     explicit OstrelLogGenerator(const Clock& clock) : LogGenerator(clock) {}
 
     /// The DLF log of the state's history: a version report, then each entry's raw messages. Absent, with a
-    /// log line, when an entry's raw material is not bytes.
+    /// log line, when an entry's raw messages are not bytes.
     [[nodiscard]] std::optional<Data> generateDlfFromState(const Dictionary& state) const;
 
     /// The history and, where it can be written, the DLF log.
     [[nodiscard]] ArrayRef getSaveContentsFromState(const Dictionary& state) const override;
 
 protected:
-    /// Raw log messages since the last display, one behind the other.
+    /// Raw log messages since the last display, one after another.
     std::vector<std::uint8_t> _binData;
 
     /// Appends a message to them, where a history is kept.
@@ -37,8 +37,8 @@ protected:
         _binData.insert(_binData.end(), bytes.begin(), bytes.end());
     }
 
-    /// Ends a refresh: moves the raw messages into the state under "DisplayState", starts collecting anew and
-    /// appends to the history, where one is kept.
+    /// Ends a refresh: moves the raw messages into the state under "DisplayState", starts a new collection
+    /// and appends to the history, where one is kept.
     void keepRefresh(Dictionary& state);
 };
 

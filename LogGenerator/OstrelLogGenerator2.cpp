@@ -79,7 +79,7 @@ void OstrelLogGenerator2::updateStateTelling(Dictionary& state, const Data& data
     if (!subscribers)
         return;
     for (auto section = subscribers->begin(); section != subscribers->end(); ++section)
-        // A section that lists a code twice is called twice, and told of once.
+        // A section that lists a code twice is called twice and reported once.
         if (std::find(subscribers->begin(), section, *section) == section)
             if (const Value node = (*section)->node(); !node.isNone())
                 effects.section((*section)->getSectionName(), node);

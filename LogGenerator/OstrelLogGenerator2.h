@@ -14,10 +14,9 @@
 namespace velmora {
 
 /// The template-driven decoder of the binary families. It builds the display from its template once per state
-/// and hands every section its node, frames each log message and routes it by log code to the sections that
-/// want it, has them write what they keep when the display is handed out, and moves the raw messages into the
-/// history at each refresh. A technology's subclass only chooses
-/// the template and the class index.
+/// and hands every section its node, frames each log message and routes it by log code to its subscribers,
+/// has them write what they keep when the display is handed out, and moves the raw messages into the history
+/// at each refresh. A technology's subclass only chooses the template and the class index.
 ///
 /// State keys beside LogGenerator's: "Template", the template as it was loaded.
 class OstrelLogGenerator2 : public OstrelLogGenerator {
@@ -28,7 +27,7 @@ public:
     ~OstrelLogGenerator2() override;
 
     void updateState(Dictionary& state, const Data& data) override;
-    /// Tells of the sections that want the message's code.
+    /// Reports the subscribers of the message's code.
     void updateStateTelling(Dictionary& state, const Data& data, MessageEffects& effects) override;
     [[nodiscard]] Value generateLogUsingState(Dictionary& state) override;
     [[nodiscard]] Value display(Dictionary& state) override;
@@ -42,11 +41,11 @@ public:
     /// A copy of the template in which every section holds its own node; none for a foreign kind of value.
     [[nodiscard]] Value processTemplate(const Value& object);
 
-    /// Walks a display and logs every value that is no string, array or dictionary.
+    /// Logs every value of a display that is no string, array or dictionary.
     void printDict(const Value& object) const;
 
     /// The state's display with all that has arrived, or none. The call that builds the display returns none,
-    /// not the display: callers take that as nothing to show yet. That is meant.
+    /// not the display: callers take that as nothing to show yet. That is intended.
     [[nodiscard]] Value getDisplayFromState(Dictionary& state);
 
     [[nodiscard]] const ClassIndex& classIndex() const { return *cIndex; }

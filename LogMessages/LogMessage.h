@@ -42,7 +42,7 @@ struct LogMessage {
     bool prefixed = false;
     std::uint8_t type = 0;  ///< as it stands: `parse` does not judge it
     std::uint16_t code = 0; ///< as it stands
-    Bytes record;           ///< the message less its prefix
+    Bytes record;           ///< the message without its prefix
 
     /// Reads a message; none where it is shorter than a header. That is its length as it arrived, prefix
     /// included, so that a prefixed message may have a record of 11 bytes, which ends within the time stamp.

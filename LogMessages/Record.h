@@ -19,10 +19,10 @@ public:
 };
 
 /// The bytes of one log record (or of one entry in it), read by offset. Multi-byte fields are little-endian
-/// unless the name says otherwise. It does not own the bytes.
+/// unless the name says otherwise. Non-owning.
 ///
-/// Precondition of every read: the field lies inside the record. Sections see to that with their minimum
-/// length; a read outside is an error of ours and throws std::out_of_range before any byte is touched.
+/// Precondition of every read: the field lies inside the record. Sections ensure that by their minimum
+/// length; a read outside is a programming error and throws std::out_of_range before any byte is read.
 class Record {
 public:
     explicit Record(Bytes bytes) : _bytes(bytes) {}
@@ -90,26 +90,26 @@ private:
     Bytes _bytes;
 };
 
-/// The entries that a record's count announces: entry i lies `stride` bytes times i after `first` and is
-/// `entryLength` bytes long (which may exceed the stride, where entries overlap).
+/// The entries of a counted list: entry i lies `stride` bytes times i after `first` and is `entryLength`
+/// bytes long (which may exceed the stride, where entries overlap).
 class CountedList {
 public:
     CountedList(const Record& record, std::size_t first, std::size_t stride, std::size_t entryLength,
                 std::size_t count)
         : _record(record), _first(first), _stride(stride), _entryLength(entryLength), _count(count) {}
 
-    /// A list whose entries stand side by side.
+    /// A list whose entries are contiguous.
     CountedList(const Record& record, std::size_t first, std::size_t entryLength, std::size_t count)
         : CountedList(record, first, entryLength, entryLength, count) {}
 
-    /// How many entries the record announces.
+    /// The count in the record.
     [[nodiscard]] std::size_t count() const { return _count; }
 
     /// Whether all of them lie inside the record, which takes no division.
     [[nodiscard]] bool isWhole() const {
         return _count == 0 || _record.has(_first + _stride * (_count - 1), _entryLength);
     }
-    /// How many of them, from the first on, lie wholly inside the record.
+    /// How many of them, from the first on, lie completely inside the record.
     [[nodiscard]] std::size_t whole() const {
         if (!_record.has(_first, _entryLength))
             return 0;
@@ -125,9 +125,9 @@ public:
         return _record.part(_first + _stride * index, _entryLength);
     }
 
-    /// How far apart the entries begin.
+    /// The distance between the starts of two entries.
     [[nodiscard]] std::size_t stride() const { return _stride; }
-    /// What the record holds from the first entry to the end of the last whole one.
+    /// The record's bytes from the first entry to the end of the last complete one.
     [[nodiscard]] Record entries() const {
         const std::size_t count = whole();
         return count == 0 ? Record(Bytes()) : _record.part(_first, _stride * (count - 1) + _entryLength);

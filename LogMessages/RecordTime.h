@@ -13,16 +13,16 @@
 /// System time runs since 1980-01-06 00:00:00 UTC without leap seconds; since 2017 it is 18 s ahead of UTC.
 namespace velmora {
 
-/// The moment that a record's time stamp means, to the nearest nanosecond; a leap second itself shows as the
-/// second after it. None where the lower 16 bits are out of range, or the moment lies past the end of `Time`
-/// (the year 2262).
+/// The time that a record's time stamp denotes, to the nearest nanosecond; a leap second becomes the second
+/// after it. None where the lower 16 bits are out of range, or the time is past the end of `Time` (the year
+/// 2262).
 [[nodiscard]] std::optional<Time> timeOfRecord(std::uint64_t timestamp);
 
-/// Whether there is such a moment.
+/// Whether there is such a time.
 [[nodiscard]] bool isRecordTime(std::uint64_t timestamp);
 
-/// The time stamp of a moment, to the nearest 1/32 chip; 0 for moments before 1980-01-06. Leap seconds that
-/// have been announced after 2017 are not known.
+/// The time stamp of a time, to the nearest 1/32 chip; 0 for times before 1980-01-06. Leap seconds after 2017
+/// are not included.
 [[nodiscard]] std::uint64_t recordTimestamp(Time moment);
 
 } // namespace velmora

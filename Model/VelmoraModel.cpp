@@ -115,7 +115,7 @@ void VelmoraModel::destroyPorts() {
         _displayUpdateTimer.reset();
     }
     // Without the callbacks, so that closing does not restart the monitor. Each field is cleared first:
-    // whoever looks during the closing sees it closed.
+    // observers during the closing see it closed.
     if (const auto port = std::exchange(_recvPort, nullptr)) {
         port->setInvalidationCallback({});
         port->invalidate();

@@ -18,7 +18,7 @@
 
 namespace velmora {
 
-/// The application object as the model knows it: it is told to redraw.
+/// The application object as the model knows it: it is notified to redraw.
 class ModelObserver {
 public:
     virtual ~ModelObserver() = default;
@@ -26,7 +26,7 @@ public:
     virtual void updateViewControllerFromModel() = 0;
 };
 
-/// What the model asks of the machine. All of it must outlive the model.
+/// The platform that the model needs. All of it must outlive the model.
 struct ModelPlatform {
     MessagePorts& ports;
     MainQueue& queue;
@@ -39,11 +39,11 @@ struct ModelPlatform {
 /// The local port's name under a reverse-DNS prefix: "com.velmora" gives the application's.
 [[nodiscard]] std::string logChannelPortName(std::string_view prefix = "com.velmora");
 
-/// The one object that talks to the telephony service: it opens the log channel, has a decoder picked for the
-/// technology that the service names, starts it, feeds it every log message, and has the screens redrawn
+/// The one object that talks to the telephony service: it opens the log channel, selects a decoder for the
+/// technology that the service names, starts it, passes every log message to it, and has the screens redrawn
 /// every 2 seconds if anything arrived. It owns the display tree made of the decoder's output. Every failure
-/// on the way up closes the ports and is tried again 5 seconds later, without limit; a channel that dies
-/// restarts.
+/// in the start sequence closes the ports and is retried 5 seconds later, without limit; a channel that is
+/// lost restarts.
 ///
 /// Held by shared_ptr, since a retry that is due keeps the model alive. Main thread only.
 class VelmoraModel : public std::enable_shared_from_this<VelmoraModel> {
@@ -63,13 +63,13 @@ public:
     /// Stops the timer and closes both ports, without a restart. Decoder, state and tree stay.
     void destroyPorts();
     /// The "GetTechnology" exchange. The decoder changes only when the answer names a technology (to none
-    /// where no decoder knows it); after any other outcome the one of an earlier connection goes on.
+    /// where no decoder knows it); after any other outcome the decoder of an earlier connection is kept.
     void configureGenerator();
     /// The whole start sequence with its retry; nothing while monitoring is running.
     void startMonitor();
     void restartMonitor();
 
-    /// Hands one log message to the decoder.
+    /// Passes one log message to the decoder.
     virtual void updateWithData(const Data& data);
 
     /// The timer's action: notices a dead service, and has the screens redrawn if anything arrived.
@@ -107,7 +107,7 @@ private:
     bool _updated = false;
     std::unique_ptr<LogGenerator> _logGenerator;
     /// Created once and never replaced: it survives reconnection and a change of decoder, so that a new
-    /// decoder starts with whatever the earlier one left in it. That is meant.
+    /// decoder starts with what the earlier one left in it. That is intended.
     Dictionary _state;
     /// The cached tree and its paths: set together, dropped together.
     NodeRef _nodes;

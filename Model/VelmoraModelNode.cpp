@@ -22,7 +22,7 @@ std::vector<NodeRef> childrenOf(const Dictionary& dictionary, const std::string&
     for (const Dictionary::Entry& entry : dictionary)
         if (entry.key != sortedMarker && !entry.value.isNone())
             entries.push_back(&entry);
-    // By the keys' bytes, not by number: "10;7" stands before "2;7".
+    // By the keys' bytes, not by number: "10;7" comes before "2;7".
     if (isSorted)
         std::sort(entries.begin(), entries.end(),
                   [](const auto* a, const auto* b) { return a->key < b->key; });

@@ -22,8 +22,7 @@ namespace velmora {
 /// Writes the bytes' base64, base64Size() characters.
 void putBase64(char* text, Bytes bytes);
 
-/// The bytes that the text stands for, with spaces, tabs and line ends anywhere in it; none where it is not
-/// base64.
+/// Decodes base64 text, ignoring spaces, tabs and line ends; absent for any other text.
 [[nodiscard]] std::optional<std::vector<std::uint8_t>> bytesOfBase64(std::string_view text);
 
 } // namespace velmora

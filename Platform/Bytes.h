@@ -37,27 +37,27 @@ template <std::unsigned_integral Number>
         return number;
 }
 
-/// A shared, unchanging byte buffer, or a window on one. Copying it, or taking a part of it, copies no byte:
+/// A shared, immutable byte buffer, or a window on one. Copying it, or taking a part of it, copies no byte:
 /// the log message that arrived at the port, the record without its prefix, the state's raw log and the
 /// snapshot's entry can all be the same memory. May be passed between threads like a shared_ptr.
 class Data {
 public:
     Data() = default;
 
-    /// Takes the buffer over.
+    /// Takes ownership of the buffer.
     explicit Data(std::vector<std::uint8_t>&& buffer) {
         auto owner = std::make_shared<const std::vector<std::uint8_t>>(std::move(buffer));
         _window = Bytes(*owner);
         _owner = std::move(owner);
     }
 
-    /// A buffer of its own with the same bytes.
+    /// An independent buffer with the same bytes.
     [[nodiscard]] static Data copyOf(Bytes bytes) {
         return Data(std::vector<std::uint8_t>(bytes.begin(), bytes.end()));
     }
 
-    /// `length` bytes of a buffer that its owner shares out, from `offset` on, cut to what the buffer holds.
-    /// The bytes in the window must not change any more; the window keeps the whole buffer alive.
+    /// `length` bytes of a shared buffer from `offset` on, truncated to the buffer's size. The bytes in the
+    /// window must not change any more; the window keeps the entire buffer alive.
     Data(std::shared_ptr<const std::vector<std::uint8_t>> owner, std::size_t offset, std::size_t length)
         : _owner(std::move(owner)) {
         if (_owner && offset < _owner->size())

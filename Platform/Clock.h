@@ -7,10 +7,10 @@
 
 namespace velmora {
 
-/// A moment, to the nanosecond (recordings keep that much).
+/// A point in time, to the nanosecond (the resolution of recordings).
 using Time = std::chrono::sys_time<std::chrono::nanoseconds>;
 
-/// How local time stands to UTC at some moment.
+/// The offset of local time from UTC at a point in time.
 struct ZoneState {
     std::chrono::seconds offset{0}; ///< east of UTC positive, daylight-saving time included
     bool daylightSaving = false;

@@ -9,7 +9,7 @@ namespace velmora {
 
 namespace {
 
-// Null stands for standard output, whose address is no constant.
+// Null means standard output, whose address is not a constant expression.
 std::FILE* console = nullptr;
 
 } // namespace

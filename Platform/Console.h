@@ -8,8 +8,7 @@
 
 namespace velmora {
 
-/// Prints a line where the process's classes print what is not for the log (standard output unless
-/// redirected).
+/// Prints a line that is not for the log (to standard output unless redirected).
 void printLine(std::string_view text);
 
 /// Sends those lines to `stream` from now on; a program whose standard output carries a result keeps it clean

@@ -30,8 +30,8 @@ namespace velmora {
 /// The date description: "2026-11-16 05:00:00 +0000", UTC, sortable as text.
 [[nodiscard]] std::string dateDescription(Time moment);
 
-/// The moment that a date description names, whatever its zone; none for any other text, and for years that
-/// lie outside of 1678 to 2261.
+/// The time that a date description denotes, in any zone; none for any other text, and for years outside 1678
+/// to 2261.
 [[nodiscard]] std::optional<Time> timeOfDateDescription(std::string_view text);
 
 /// Local date and time through the clock's zone: "2026-11-16 at 06:00:00" with the separator " at ".

@@ -10,17 +10,17 @@
 
 namespace velmora {
 
-/// What the application asks of the machine's files. Main thread only.
+/// The file operations that the application needs. Main thread only.
 class FileSystem {
 public:
     virtual ~FileSystem() = default;
-    /// Whether there is anything, file or directory, at this absolute path. Where the program was given a
-    /// system root, the path is looked for under it.
+    /// Whether a file or directory exists at this absolute path, looked up under the program's system root if
+    /// it has one.
     [[nodiscard]] virtual bool exists(std::string_view absolutePath) const = 0;
-    /// Where snapshots go; without a "/" at the end. It need not exist.
+    /// Where snapshots go, without a trailing "/". It need not exist.
     [[nodiscard]] virtual std::string diagnosticLogDirectory() const = 0;
-    /// Makes the file at `path` as it stands, or replaces its content in place: who reads it meanwhile sees
-    /// part of it. A missing directory is a failure.
+    /// Creates the file at `path`, or replaces its content in place: a concurrent reader sees part of it. A
+    /// missing directory is a failure.
     virtual Result<Done> writeDirectly(const std::string& path, std::string_view content) = 0;
 };
 

@@ -9,15 +9,14 @@
 
 namespace velmora {
 
-/// A repeating timer that is running. Destroying or invalidating it stops it; it may do both from its own
-/// action.
+/// A running repeating timer. Destroying or invalidating it stops it; both are allowed in its own action.
 class Timer {
 public:
     virtual ~Timer() = default;
     virtual void invalidate() = 0;
 };
 
-/// The queue of the main thread: tasks run there one after the other, never inside the call that queues them.
+/// The queue of the main thread: tasks run there one after another, never inside the call that queues them.
 class MainQueue {
 public:
     using Task = std::function<void()>;
@@ -28,7 +27,7 @@ public:
     /// Runs the task once the delay has passed.
     virtual void after(std::chrono::nanoseconds delay, Task task) = 0;
     /// Runs the action every `interval` until the timer is stopped. Ticks missed while the thread was busy
-    /// are not made up for.
+    /// are skipped.
     [[nodiscard]] virtual std::unique_ptr<Timer> repeating(std::chrono::nanoseconds interval,
                                                            Task action) = 0;
 };

@@ -26,7 +26,7 @@ inline constexpr std::int32_t TransportError =
 inline constexpr std::int32_t BecameInvalid = -5; ///< the connection ended while the answer was awaited
 } // namespace PortStatus
 
-/// A named port of this process on which messages arrive. Whoever holds it owns it; the last reference, or
+/// A named port of this process on which messages arrive. Its holders own it; dropping the last reference, or
 /// `invalidate`, closes it and frees its name. Callbacks run on the main queue, and each of them may
 /// invalidate the port or drop the last reference to it. Main thread only.
 class LocalPort {
@@ -34,7 +34,7 @@ public:
     virtual ~LocalPort() = default;
     [[nodiscard]] virtual const std::string& name() const = 0;
     [[nodiscard]] virtual bool isValid() const = 0;
-    /// Lets callbacks run. A port that has not been attached takes no message; senders wait.
+    /// Lets callbacks run. A port that is not attached receives no message; senders wait.
     virtual void attachToMainQueue() = 0;
     /// Called once when the port becomes invalid, whether by `invalidate` or because the platform closed it,
     /// with the port (alive for the length of the call). An empty function removes the callback.
@@ -48,7 +48,7 @@ class RemotePort {
 public:
     struct Answer {
         std::int32_t status = PortStatus::Success;
-        std::optional<Data> reply; ///< absent where none was asked for or the peer gave none
+        std::optional<Data> reply; ///< absent where none was requested or the peer sent none
     };
 
     virtual ~RemotePort() = default;
@@ -70,15 +70,15 @@ public:
     /// Messages that `post` has dropped since the port was made.
     [[nodiscard]] virtual std::uint64_t droppedMessages() const = 0;
     /// Messages that `post` has queued and the peer has not taken; 0 where the port keeps no queue. A sender
-    /// that can wait, waits while there are many.
+    /// may wait while there are many.
     [[nodiscard]] virtual std::size_t waitingMessages() const { return 0; }
 };
 
 /// The machine's ports.
 class MessagePorts {
 public:
-    /// What a message's receiver answers: reply data, or nothing. An empty answer to a request is sent as a
-    /// reply without data.
+    /// Returns the receiver's reply, or nothing. An empty answer to a request is sent as a reply without
+    /// data.
     using MessageCallback =
         std::function<std::optional<Data>(LocalPort& port, std::int32_t messageId, const Data& payload)>;
 

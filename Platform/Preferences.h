@@ -8,7 +8,7 @@
 namespace velmora {
 
 /// The preferences of another process, each a value under a key of that process's domain
-/// ("com.velmora.HomeScreen"). What cannot be done is an error line in the log. Main thread only.
+/// ("com.velmora.HomeScreen"). Failures are error lines in the log. Main thread only.
 class Preferences {
 public:
     virtual ~Preferences() = default;
@@ -16,7 +16,7 @@ public:
     virtual void setBoolean(std::string_view domain, std::string_view key, bool value) = 0;
     /// Writes what was set in the domain to where its process reads it; everything else there stays.
     virtual void synchronize(std::string_view domain) = 0;
-    /// Tells whoever listens that the value changed, so that it is picked up at once.
+    /// Announces to listeners that the value changed, so that they reload it.
     virtual void announceChange(std::string_view domain, std::string_view key) = 0;
 };
 

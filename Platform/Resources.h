@@ -13,13 +13,13 @@
 
 namespace velmora {
 
-/// The files that the application carries: display templates and the like. Everybody asks `resources()`, the
-/// process's one set; a test or a program puts another in its place with `setResources`.
+/// The files that come with the application, such as display templates. All code uses `resources()`, the
+/// process's only set; tests and programs replace it with `setResources`.
 class Resources {
 public:
     virtual ~Resources() = default;
-    /// The content of the resource `name`.`type` ("Ostrel_GSM", "plist"); the reason names the places looked
-    /// at.
+    /// The content of the resource `name`.`type` ("Ostrel_GSM", "plist"); the reason names the directories
+    /// searched.
     [[nodiscard]] virtual Result<Data> read(std::string_view name, std::string_view type) const = 0;
     /// The names, without directory and extension, of all resources of a type, sorted, each once.
     [[nodiscard]] virtual std::vector<std::string> list(std::string_view type) const = 0;
@@ -32,7 +32,7 @@ public:
 /// The process's resources. Precondition: some have been set.
 [[nodiscard]] Resources& resources();
 
-/// Puts others in place; the caller keeps them alive. Returns the earlier ones (null at first).
+/// Replaces the resources; the caller keeps them alive. Returns the earlier ones (null at first).
 Resources* setResources(Resources* others);
 
 } // namespace velmora

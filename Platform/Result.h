@@ -9,14 +9,14 @@
 
 namespace velmora {
 
-/// Why something could not be done: lower-case prose without a full stop that gives the value found and the
-/// value wanted, ready to follow "file: " in a message.
+/// Why something could not be done: lower-case prose without a full stop with the found and the expected
+/// value, to be appended to "file: " in a message.
 struct Failure {
     std::string reason;
 };
 
 /// The outcome of something that can fail for reasons outside the program: a value, or one reason. Test it
-/// before use; reading the value of a failure is an error of the caller's and throws std::bad_variant_access.
+/// before use; reading the value of a failure is a programming error and throws std::bad_variant_access.
 template <class T>
 class [[nodiscard]] Result {
 public:
@@ -37,7 +37,7 @@ private:
     std::variant<T, Failure> _outcome;
 };
 
-/// The value of a result that carries nothing but success.
+/// The value of a result without a value.
 struct Done {};
 
 } // namespace velmora

@@ -27,7 +27,7 @@ void detail::writeToSystemLog(int priority, std::string_view text) {
 }
 
 void logFormat(int priority, const char* format, ...) {
-    if (!systemLogWants(priority))
+    if (!isLogged(priority))
         return;
     std::va_list arguments;
     va_start(arguments, format);

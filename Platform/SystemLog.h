@@ -22,27 +22,27 @@ inline constexpr int Debug = 7;
 class SystemLog {
 public:
     virtual ~SystemLog() = default;
-    /// One line. The text may end in a line feed, which is part of the line as its writer wrote it.
+    /// One line. A trailing line feed is part of the text.
     virtual void write(int priority, std::string_view text) = 0;
 };
 
 /// Sends the process's log lines to `log` from now on; those whose priority is above `level` (0 to 7) are
-/// left out. Null sends them nowhere. The caller keeps `log` alive while it is set. Returns the earlier one.
+/// left out. Null discards them. The caller keeps `log` alive while it is set. Returns the earlier one.
 SystemLog* setSystemLog(SystemLog* log, int level = LogPriority::Debug);
 
 namespace detail {
-inline int systemLogLevel = -1; ///< -1 while no log is set, so that nothing passes
+inline int systemLogLevel = -1; ///< -1 while no log is set, so that no line is enabled
 void writeToSystemLog(int priority, std::string_view text);
 } // namespace detail
 
 /// Whether a line of this priority would be written at all.
-[[nodiscard]] inline bool systemLogWants(int priority) {
+[[nodiscard]] inline bool isLogged(int priority) {
     return (priority & 7) <= detail::systemLogLevel;
 }
 
-/// Writes the text as it stands.
+/// Writes the text unchanged.
 inline void logLine(int priority, std::string_view text) {
-    if (systemLogWants(priority))
+    if (isLogged(priority))
         detail::writeToSystemLog(priority, text);
 }
 

@@ -12,7 +12,7 @@
 
 namespace velmora {
 
-/// What a call to the telephony service ends with; a code of 0 is success.
+/// The result of a call to the telephony service; a code of 0 is success.
 struct VoxError {
     std::int32_t domain = 0;
     std::int32_t code = 0;
@@ -29,13 +29,13 @@ class TelephonyService {
 public:
     virtual ~TelephonyService() = default;
 
-    /// Connects to the service; null when it is not there. `callback` runs on the main queue when the service
-    /// has something to say on this connection, for as long as the connection is held.
+    /// Connects to the service; null when it is not running. `callback` runs on the main queue for events of
+    /// this connection while the connection is held.
     [[nodiscard]] virtual std::shared_ptr<VoxServerConnection>
     _VoxServerConnectionCreate(std::function<void()> callback) = 0; // NOLINT: the service's own name
 
     /// Asks for a log channel that sends to the local port `localPortName`; `remotePortName` becomes the name
-    /// of the port that takes the channel's commands. It may come back empty, as an error of the service's.
+    /// of the port that takes the channel's commands. It may be empty, by an error of the service.
     [[nodiscard]] virtual VoxError
     _VoxServerConnectionNetworkMonitorCreateLogChannel( // NOLINT: the service's own name
         VoxServerConnection& connection, const std::string& localPortName, std::string& remotePortName) = 0;
@@ -57,7 +57,7 @@ inline constexpr std::array voxTechnologies = {
     kVoxLogChannelTechnology_Ostrel_UTRAN2,
 };
 
-/// What stands before a technology's short name ("Ostrel_GSM") in the service's constant.
+/// The prefix of a technology's short name ("Ostrel_GSM") in the service's constant.
 inline constexpr std::string_view voxTechnologyPrefix = "kVoxLogChannelTechnology_";
 
 /// The short name that people and recordings use: "Ostrel_GSM" of "kVoxLogChannelTechnology_Ostrel_GSM". A
@@ -119,7 +119,7 @@ inline constexpr std::string_view kVoxCellMonitorRSCP = "kVoxCellMonitorRSCP";
 inline constexpr std::string_view kVoxCellMonitorECN0 = "kVoxCellMonitorECN0";
 inline constexpr std::string_view kVoxCellMonitorBandInfo = "kVoxCellMonitorBandInfo";
 
-/// What is said between the application and the service's ports, in property lists as message id 0.
+/// The protocol between the application and the service's ports: property lists in messages of id 0.
 namespace vox {
 /// The name under which the service listens.
 inline constexpr std::string_view serverPortName = "com.velmora.vox.server";

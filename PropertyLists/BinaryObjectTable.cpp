@@ -86,7 +86,7 @@ Result<BinaryObject> BinaryObjectTable::object(std::uint64_t index) const {
     return BinaryObject{place, _input[place], place + 1, 0};
 }
 
-/// The count stands in the marker's low half, or, where that is 15, in an integer object behind the marker.
+/// The count is in the marker's low half or, where that is 15, in an integer object after the marker.
 Result<Done> BinaryObjectTable::readCount(BinaryObject& object) const {
     object.count = object.marker & 0x0F;
     if (object.count != 0x0F)

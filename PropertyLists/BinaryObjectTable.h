@@ -21,8 +21,8 @@ struct BinaryObject {
 };
 
 /// The frame of a binary property list: the header, the trailer with its sizes, and the offset table by which
-/// objects are found. What it gives out lies inside the input; whether an object's content does is for its
-/// reader to check against `end`. Views the input, which must outlive it.
+/// objects are found. The offsets that it returns lie inside the input; whether an object's content does has
+/// to be checked against `end`. Views the input, which must outlive it.
 class BinaryObjectTable {
 public:
     /// Checks header and trailer. The reason names the field that is wrong.
@@ -44,7 +44,7 @@ public:
 
     /// The object of that index. Precondition: index < objectCount().
     [[nodiscard]] Result<BinaryObject> object(std::uint64_t index) const;
-    /// Sets the object's count, of any size, and moves its content behind it.
+    /// Sets the object's count, of any size, and moves its content past the count.
     [[nodiscard]] Result<Done> readCount(BinaryObject& object) const;
 
 private:

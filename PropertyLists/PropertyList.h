@@ -12,7 +12,7 @@
 
 namespace velmora {
 
-/// What a property list may ask of its reader. Input that goes past a limit is refused whole.
+/// The limits of a property-list reader. Input that exceeds one is rejected.
 struct PropertyListLimits {
     /// Arrays and dictionaries nested in one another, the root being 1.
     std::size_t maximumDepth = 128;
@@ -27,27 +27,27 @@ struct PropertyListLimits {
 /// Never reads past the input and never takes more time, memory or stack than the limits allow, whatever the
 /// input holds. Integers outside the range of a signed 64-bit number, text that is not valid Unicode, and
 /// anything after the root value but white space are refused, and so are dates outside the years 0001 to
-/// 9999; fractions of a date's second are dropped. Values that stand behind several references become values
-/// of their own, and the text and data that they repeat may not add up to more than the input might have. A
-/// key that stands twice in a dictionary keeps its first place and its last value. A reason gives the offset
-/// in the input wherever it concerns one place.
+/// 9999; fractions of a date's second are dropped. Values that are referenced several times are copied, and
+/// the total size of their text and data is limited to that of the largest input. A duplicate key of a
+/// dictionary keeps its first position and its last value. A reason gives the offset in the input where it
+/// has one.
 Result<Value> readPropertyList(Bytes input, const PropertyListLimits& limits = {});
 
-/// The XML form, version 1.0. Fails for what the form cannot carry: no value, a string with a control
+/// The XML form, version 1.0. Fails for what the form cannot represent: no value, a string with a control
 /// character that XML does not know or that is not UTF-8, a date outside the years 0001 to 9999, nesting
-/// deeper than the reader's default limit (as a value that contains itself has).
+/// deeper than the reader's default limit (which a value that contains itself exceeds).
 Result<std::string> writeXMLPropertyList(const Value& root);
 
 /// The binary form, version 00. Fails for no value, text that is not UTF-8, a date outside the years 0001 to
 /// 9999, and nesting deeper than the reader's default limit.
 Result<std::vector<std::uint8_t>> writeBinaryPropertyList(const Value& root);
 
-/// The reader of the binary form alone, without a look at what the input begins with.
+/// The reader of the binary form only, regardless of the input's first bytes.
 Result<Value> readBinaryPropertyList(Bytes input, const PropertyListLimits& limits);
 
-/// The reader of the XML form alone: one value, inside <plist> or bare. The text is UTF-8, whatever encoding
-/// the document names. Attributes, comments, processing instructions and the document type are passed over;
-/// of references only XML's own five and those to characters are known.
+/// The reader of the XML form only: one value, inside <plist> or bare. The text is UTF-8, whatever encoding
+/// the document names. Attributes, comments, processing instructions and the document type are skipped; only
+/// XML's five predefined references and character references are supported.
 Result<Value> readXMLPropertyList(Bytes input, const PropertyListLimits& limits);
 
 } // namespace velmora

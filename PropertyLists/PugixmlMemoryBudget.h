@@ -9,8 +9,8 @@
 
 namespace velmora {
 
-/// While it lives, pugixml gets this much memory and no more: a document of nothing but tags and attributes
-/// takes many times its own size. pugixml has one allocator a process, hence the static; main thread only.
+/// Limits pugixml's memory during its lifetime: a document of nothing but tags and attributes takes many
+/// times its own size. pugixml has one allocator per process, hence the static; main thread only.
 class PugixmlMemoryBudget {
 public:
     explicit PugixmlMemoryBudget(std::size_t bytes)
@@ -25,7 +25,7 @@ public:
     PugixmlMemoryBudget(const PugixmlMemoryBudget&) = delete;
     PugixmlMemoryBudget& operator=(const PugixmlMemoryBudget&) = delete;
 
-    /// Whether it wanted more; where it got none all the same, the machine had none.
+    /// Whether the limit was hit; otherwise a failed allocation means that the machine is out of memory.
     [[nodiscard]] bool isExhausted() const { return exhausted; }
 
 private:

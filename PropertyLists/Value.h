@@ -60,10 +60,10 @@ public:
     [[nodiscard]] const bool* asBoolean() const { return std::get_if<bool>(&_held); }
     [[nodiscard]] const Date* asDate() const { return std::get_if<Date>(&_held); }
     [[nodiscard]] const Data* asData() const { return std::get_if<Data>(&_held); }
-    /// The shared node itself, which may be changed through the pointer unless it is frozen.
+    /// The shared node itself, which may be modified through the pointer unless it is frozen.
     [[nodiscard]] Array* asArray() const;
     [[nodiscard]] Dictionary* asDictionary() const;
-    /// As above, with a share in the ownership; null where the value is of another kind.
+    /// As above, with shared ownership; null where the value is of another kind.
     [[nodiscard]] ArrayRef arrayRef() const;
     [[nodiscard]] DictionaryRef dictionaryRef() const;
     /// Whether this is an array or dictionary that no other reference shares.

@@ -28,7 +28,7 @@ std::string_view trimmed(std::string_view text) {
 }
 
 /// Takes a sign off the text's front; whether it was a minus.
-bool takeSign(std::string_view& text) {
+bool parseSign(std::string_view& text) {
     if (text.empty() || (text.front() != '-' && text.front() != '+'))
         return false;
     const bool negative = text.front() == '-';
@@ -72,7 +72,7 @@ std::optional<char32_t> referenced(std::string_view name) {
 
 XMLInteger integerOfXML(std::string_view text) {
     text = trimmed(text);
-    const bool negative = takeSign(text);
+    const bool negative = parseSign(text);
     int base = 10;
     if (text.starts_with("0x") || text.starts_with("0X")) {
         text.remove_prefix(2);
@@ -91,7 +91,7 @@ XMLInteger integerOfXML(std::string_view text) {
 
 std::optional<double> realOfXML(std::string_view text) {
     text = trimmed(text);
-    const bool negative = takeSign(text);
+    const bool negative = parseSign(text);
     double magnitude = 0;
     if (text == "nan") {
         magnitude = std::numeric_limits<double>::quiet_NaN();

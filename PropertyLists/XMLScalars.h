@@ -14,9 +14,9 @@
 namespace velmora {
 
 /// The texts of an XML property list's elements as values, and back. Each reading function takes the text of
-/// one element, its references replaced, and gives nothing where the text is not what the element wants.
+/// one element, its references replaced, and returns nothing where the text is invalid for the element.
 
-/// Decimal or, behind "0x", hexadecimal, with or without sign, white space around it.
+/// Decimal or, after "0x", hexadecimal, with or without sign, white space around it.
 struct XMLInteger {
     enum class Status : std::uint8_t { Good, NotANumber, OutOfRange };
     Status status = Status::NotANumber;
@@ -27,7 +27,7 @@ struct XMLInteger {
 /// A decimal number, with or without exponent, or "nan", "inf" or "infinity", with or without sign, white
 /// space around it. Numbers that no double comes near are refused.
 [[nodiscard]] std::optional<double> realOfXML(std::string_view text);
-/// The fewest digits that give the same number back; "nan", "+infinity", "-infinity".
+/// The shortest decimal text that reads as the same number; "nan", "+infinity", "-infinity".
 [[nodiscard]] std::string xmlOfReal(double real);
 
 /// "2026-11-16T05:00:00Z" and nothing else: four digits of year from 0001 on, a day of the calendar, hours to
@@ -42,7 +42,7 @@ struct XMLInteger {
 void appendXMLOfData(std::string& output, Bytes bytes, std::string_view indent);
 
 /// Text with "&lt;" and its like, or "&#38;" and its like, replaced. References that XML itself does not
-/// define are not known, and so is a "&" that begins none: `reference` is then what stands there.
+/// define are unknown, and so is a "&" that starts none: `unknownReference` is then that text.
 struct XMLUnescaped {
     std::optional<std::string> text;
     std::string_view unknownReference;

@@ -11,21 +11,21 @@
 
 namespace velmora {
 
-/// What XML 1.0 lets stand in a document, for the reader and the writer of property lists.
+/// The characters that XML 1.0 allows in a document, for the reader and the writer of property lists.
 
 [[nodiscard]] constexpr bool isXMLSpace(char character) {
     return character == ' ' || character == '\t' || character == '\n' || character == '\r';
 }
 
-/// Whether XML knows the character: no control character but tab, line feed and carriage return.
+/// Whether XML allows the character: no control character but tab, line feed and carriage return.
 [[nodiscard]] constexpr bool isXMLCharacter(char32_t character) {
     if (character < 0x20)
         return character == '\t' || character == '\n' || character == '\r';
     return isUnicodeScalar(character) && character != 0xFFFE && character != 0xFFFF;
 }
 
-/// The offset of the first byte that begins no UTF-8 character, or one that XML does not know; absent where
-/// all the text may stand in a document.
+/// The offset of the first byte that starts no UTF-8 character, or one that XML does not allow; absent where
+/// all of the text is allowed.
 [[nodiscard]] inline std::optional<std::size_t> firstNotXML(std::string_view text) {
     std::size_t offset = 0;
     while (offset < text.size()) {

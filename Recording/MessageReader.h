@@ -23,23 +23,22 @@ inline constexpr std::size_t maximumMessageSize = std::size_t{16} << 20;
 /// One log message of a file.
 struct LoggedMessage {
     Time time;                ///< when it arrived
-    Data message;             ///< exactly as it arrived at the port; may be a window on a larger buffer
-    std::uint64_t number = 0; ///< its place among the file's records, from 1, records that were lost included
+    Data message;             ///< exactly as it arrived at the port; may be a window into a larger buffer
+    std::uint64_t number = 0; ///< its number among the file's records, from 1, lost records included
     std::uint64_t offset = 0; ///< where in the file its record begins, in bytes
-    /// The refresh that came after this message and before the next, where the file tells (a snapshot keeps
-    /// what each refresh had). In a file that tells, these are all refreshes there were, whatever the
-    /// messages' times.
+    /// The refresh between this message and the next, where the file records refreshes, as a snapshot does.
+    /// In such a file these are all refreshes, whatever the messages' times.
     std::optional<Time> refresh = std::nullopt;
 };
 
-/// Something in the file that gave no message though it should have.
+/// A part of the file that should have been a message but could not be read.
 struct Loss {
-    std::uint64_t offset = 0; ///< where in the file it begins, in bytes
-    std::uint64_t bytes = 0;  ///< how many bytes of the file were left out
+    std::uint64_t offset = 0; ///< its offset in the file, in bytes
+    std::uint64_t bytes = 0;  ///< how many bytes of the file were skipped
     std::uint64_t recordNumber =
-        0;               ///< the lost record's number, or that of the next record where none is known
-    std::string reason;  ///< lower-case prose
-    bool isTail = false; ///< the file ends within a record, as when its writer was stopped
+        0;                     ///< the lost record's number, or that of the next record where none is known
+    std::string reason;        ///< lower-case prose
+    bool isTruncation = false; ///< the file is truncated inside a record, as when its writer was killed
 };
 
 /// A file read as a stream of log messages, front to back, whatever its form. What cannot be read is skipped
@@ -62,7 +61,7 @@ public:
     [[nodiscard]] virtual std::optional<LoggedMessage> next() = 0;
     /// The short name of the technology whose messages these are ("Ostrel_GSM"); empty while it is unknown.
     [[nodiscard]] virtual const std::string& technology() const = 0;
-    /// What the file is, as people call it: "recording", "snapshot", "DLF log".
+    /// The file's form, for messages: "recording", "snapshot", "DLF log".
     [[nodiscard]] virtual std::string_view form() const { return "recording"; }
     /// The read error that ended the stream early; absent when it ended with the file.
     [[nodiscard]] virtual const std::optional<Failure>& failure() const = 0;

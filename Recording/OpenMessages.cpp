@@ -5,7 +5,7 @@
 
 #include "Recording/DLF/DLFReader.h"
 #include "Recording/Files/FileSource.h"
-#include "Recording/Pcapng/RecordingReader.h"
+#include "Recording/Pcapng/PcapngReader.h"
 #include "Recording/Snapshots/SnapshotReader.h"
 
 #include <algorithm>
@@ -53,11 +53,11 @@ Result<std::unique_ptr<MessageReader>> openMessages(const std::string& path) {
 }
 
 Result<std::unique_ptr<MessageReader>> openMessages(ChunkedInput input) {
-    // As much as it takes to tell and no more: on a pipe that may be all there is for a while.
+    // Reads no more than the decision needs: on a pipe more may take a while to arrive.
     constexpr std::string_view sectionHeader = "\n\r\r\n";
     static_cast<void>(input.ensure(sectionHeader.size()));
     if (startsWith(input.available(), sectionHeader))
-        return generalized(RecordingReader::open(std::move(input)));
+        return generalized(PcapngReader::open(std::move(input)));
     constexpr std::size_t longestWhiteSpace = 256;
     static_cast<void>(input.ensure(longestWhiteSpace));
     if (isPropertyList(input.available()))

@@ -12,8 +12,8 @@
 
 namespace velmora {
 
-/// Opens a file of log messages - a recording, a snapshot, a DLF log - telling its form by what it begins
-/// with, never by its name. "-" is standard input. The reason does not repeat the path.
+/// Opens a file of log messages - a recording, a snapshot, a DLF log - recognising its form by its first
+/// bytes, never by its name. "-" is standard input. The reason does not repeat the path.
 Result<std::unique_ptr<MessageReader>> openMessages(const std::string& path);
 /// As above, for an input of which nothing has been skipped.
 Result<std::unique_ptr<MessageReader>> openMessages(ChunkedInput input);

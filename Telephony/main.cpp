@@ -36,7 +36,7 @@ struct Options {
 };
 
 void declare(CLI::App& app, Options& options) {
-    app.description("The telephony service of Velmora: gives its clients the log messages of a source.");
+    app.description("The telephony service of Velmora: streams a source's log messages to its clients.");
     app.set_version_flag("--version", std::string(program) + " " VELMORA_VERSION);
     app.add_option("--source", options.source,
                    "Where the messages come from: " + std::string(velmora::sourceForms))

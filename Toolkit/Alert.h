@@ -7,8 +7,9 @@
 
 namespace velmora {
 
-/// A notice with a title, a message and one button. `show` puts it over the program's window and returns at
-/// once; it then stays until the user closes it, also when this object is gone. It closes with its window.
+/// A notice with a title, a message and one button. `show` opens it over the program's window and returns
+/// immediately; it stays until the user closes it, also after this object's destruction. It closes with its
+/// window.
 class Alert {
 public:
     Alert(std::string title, std::string message, std::string buttonTitle);

@@ -24,23 +24,23 @@ public:
     Application(const Application&) = delete;
     Application& operator=(const Application&) = delete;
 
-    /// Null before it is made and after it is gone.
+    /// Null before its construction and after its destruction.
     [[nodiscard]] static Application* shared();
 
     /// The program's name as the user sees it in window lists ("Velmora") and the base name of its desktop
     /// entry and icon ("velmora").
     void setName(std::string_view displayName, std::string_view desktopName);
 
-    /// Runs the loop, telling the delegate once it is up; SIGINT and SIGTERM end it as `terminate` does.
+    /// Runs the loop, notifying the delegate once it is up; SIGINT and SIGTERM end it as `terminate` does.
     /// Returns the status given to `terminate`, 0 when the user closed the last window. Throws
     /// std::logic_error when it is running.
     [[nodiscard]] int run(ApplicationDelegate& delegate);
-    /// Ends the loop after telling the delegate. The first status counts. Called before `run`, it makes that
-    /// return without calling the delegate.
+    /// Ends the loop after notifying the delegate. The first status is used. Called before `run`, it makes
+    /// that return without calling the delegate.
     void terminate(int status = 0);
 
-    /// Serves events until `done` says so, looked at after every turn of the loop; false when `limit` has
-    /// passed before that. For tests, and for a program that drives its own screens.
+    /// Processes events until `done` returns true, which is checked after every iteration of the loop; false
+    /// when `limit` has passed before that. For tests, and for a program that drives its own screens.
     [[nodiscard]] bool runUntil(const std::function<bool()>& done, std::chrono::nanoseconds limit);
 
 private:

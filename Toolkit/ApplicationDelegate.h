@@ -7,14 +7,14 @@ namespace velmora {
 
 class Application;
 
-/// Hears of an application's beginning and end. Outlives the application's `run`.
+/// Receives an application's start and end. Outlives the application's `run`.
 class ApplicationDelegate {
 public:
     virtual ~ApplicationDelegate() = default;
     /// The loop is up.
     virtual void applicationDidFinishLaunching(Application& application) = 0;
     /// The loop is about to end: `terminate`, SIGINT or SIGTERM, or the last window was closed. Called once.
-    /// Nothing unless overridden.
+    /// The default does nothing.
     virtual void applicationWillTerminate(Application& application);
 };
 

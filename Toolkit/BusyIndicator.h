@@ -7,8 +7,8 @@
 
 namespace velmora {
 
-/// A grey wheel that spins while something is under way. Stopped, it is hidden and costs nothing (but keeps
-/// its place when told not to hide). Where the user wants no motion it stands still.
+/// A grey wheel that spins while something is in progress. Stopped, it is hidden and costs nothing (unless it
+/// is set not to hide). With reduced motion it does not spin.
 class BusyIndicator : public ToolbarItem {
 public:
     void startAnimating();

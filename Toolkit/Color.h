@@ -5,13 +5,13 @@
 
 namespace velmora {
 
-/// What a thing is coloured with. Colours are named for their use and follow the user's palette, light or
-/// dark, also when it changes while the program runs.
+/// Colours by their use. They follow the user's palette, light or dark, also when it changes while the
+/// program runs.
 enum class Color {
-    automatic, ///< what the toolkit gives a thing of its kind in its place (a selected row's text, say)
-    clear,     ///< nothing: what lies below shows
+    automatic, ///< the toolkit's default for the element in its state (a selected row's text, say)
+    clear,     ///< transparent
     darkText,  ///< text on the ordinary ground: dark on a light palette, light on a dark one
-    secondary, ///< text that stands back
+    secondary, ///< secondary text
     ground     ///< the ordinary ground
 };
 

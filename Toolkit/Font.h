@@ -17,7 +17,7 @@ public:
     /// The user's interface font in that size.
     [[nodiscard]] static Font systemFontOfSize(double size);
     [[nodiscard]] static Font boldSystemFontOfSize(double size);
-    /// The family of that name, or the platform's nearest where it is not installed.
+    /// The family of that name, or the platform's best match where it is not installed.
     [[nodiscard]] static Font named(std::string family, double size);
 
     /// Empty for the user's interface font.
@@ -35,7 +35,7 @@ private:
     bool _isBold;
 };
 
-/// What the text (UTF-8) takes up on one line: its advance width and the font's line height, in points. Line
+/// The size of the text (UTF-8) on one line: its advance width and the font's line height, in points. Line
 /// breaks count as blanks. Needs the application.
 [[nodiscard]] Size sizeOfText(std::string_view text, const Font& font);
 

@@ -6,8 +6,7 @@
 namespace velmora {
 
 /// Lengths and places on the screen are in points: the unit that the platform scales to the display's pixels
-/// and to the user's taste, x to the right and y downward from the top left corner of whatever holds the
-/// thing.
+/// and to the user's taste, x to the right and y downward from the top left corner of its container.
 struct Point {
     double x = 0;
     double y = 0;

@@ -20,7 +20,7 @@ public:
 
     [[nodiscard]] std::string text() const;
     void setText(std::string_view text);
-    /// What the empty field shows, standing back; the screen reader's name of the field as well.
+    /// The empty field's hint; also the field's accessible name.
     void setPlaceholder(std::string_view text);
     /// Not owned; null for none.
     void setDelegate(TextFieldDelegate* delegate);

@@ -7,7 +7,7 @@ namespace velmora {
 
 class TextField;
 
-/// Answers for a text field. Outlives the field, or takes itself off it.
+/// Decides for a text field. Outlives the field, or removes itself from it.
 class TextFieldDelegate {
 public:
     virtual ~TextFieldDelegate() = default;

@@ -44,7 +44,7 @@ bool View::State::eventFilter(QObject* watched, QEvent* event) {
     if (isPress)
         isPressed = true;
     if (isTap)
-        std::invoke(std::function<void()>(onTap)); // a copy, for the view may be gone after it
+        std::invoke(std::function<void()>(onTap)); // a copy, since the call may destroy the view
     return true;
 }
 

@@ -16,9 +16,9 @@ class QWidget;
 
 namespace velmora {
 
-/// A rectangle of the screen that draws itself and holds others. Whoever makes a view owns it; a superview
+/// A rectangle of the screen that draws itself and holds others. A view is owned by its creator; a superview
 /// only shows it. A view may be destroyed at any time, from its own callbacks too: it then leaves its
-/// superview, and its subviews stay behind without one. Needs the application; main thread only.
+/// superview, and its subviews remain without one. Needs the application; main thread only.
 class View {
 public:
     View();
@@ -53,13 +53,13 @@ public:
     /// Called for a tap or click on the view that none of its subviews takes.
     void setOnTap(std::function<void()> onTap);
 
-    /// What a screen reader calls the view; without one it takes what the view shows.
+    /// The view's name for screen readers; by default its text.
     void setAccessibleName(std::string_view name);
     [[nodiscard]] std::string accessibleName() const;
 
-    /// Takes the keyboard; false when the view can't, or is not on the screen.
+    /// Takes the keyboard focus; false when the view can't, or is not on the screen.
     bool becomeFirstResponder();
-    /// Gives the keyboard up, to nobody, if the view or something in it has it.
+    /// Releases the keyboard focus if the view or a subview has it.
     void resignFirstResponder();
     [[nodiscard]] bool isFirstResponder() const;
 
@@ -67,7 +67,7 @@ public:
     [[nodiscard]] QWidget* widget() const;
 
 protected:
-    /// For a view of another kind: takes over the widget that draws it.
+    /// For subclasses: takes ownership of the widget that draws the view.
     explicit View(QWidget* widget);
     /// Where subviews are shown; the view's own widget unless overridden.
     [[nodiscard]] virtual QWidget* subviewWidget() const;

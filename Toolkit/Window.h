@@ -14,11 +14,11 @@ namespace velmora {
 class ViewController;
 
 /// A window of the program, filled by its root controller's view. Closing the last one ends the application's
-/// loop. Owned by whoever makes it; destroying it takes it off the screen.
+/// loop. Owned by its creator; destroying it removes it from the screen.
 class Window {
 public:
-    /// Only the size of the frame counts: where windows go is the desktop's business, and on a device whose
-    /// windows fill the screen this one does.
+    /// Only the size of the frame counts: the desktop decides where windows go, and on a device whose windows
+    /// fill the screen this one does.
     explicit Window(const Rect& frame);
     ~Window();
     Window(const Window&) = delete;
@@ -27,7 +27,7 @@ public:
     [[nodiscard]] std::shared_ptr<ViewController> rootViewController() const;
     void setRootViewController(std::shared_ptr<ViewController> viewController);
 
-    /// Brings the window up with the keyboard in it; the root controller hears that it appears.
+    /// Brings the window up with the keyboard in it; the root controller is notified.
     void makeKeyAndVisible();
     [[nodiscard]] bool isHidden() const;
     /// Takes the window off the screen, or puts it back.

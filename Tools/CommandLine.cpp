@@ -13,12 +13,13 @@ namespace velmora {
 
 namespace {
 
-CLI::Validator wantsLogLevel() {
-    return wants([](const std::string& text) { return text.size() == 1 && text[0] >= '0' && text[0] <= '7'; },
-                 "a number from 0 to 7");
+CLI::Validator validLogLevel() {
+    return validator(
+        [](const std::string& text) { return text.size() == 1 && text[0] >= '0' && text[0] <= '7'; },
+        "a number from 0 to 7");
 }
 
-std::string whatIsWrong(const CLI::App& app, const CLI::ParseError& error) {
+std::string usageError(const CLI::App& app, const CLI::ParseError& error) {
     if (!app.get_subcommands().empty())
         return error.what();
     const std::vector<std::string> rest = app.remaining();
@@ -42,12 +43,12 @@ CommandLine parseCommandLine(int count, const char* const* arguments) {
     app.add_option_function<std::string>(
            "--log",
            [&line](const std::string& name) { line.log = logKindNamed(name).value_or(LogKind::Stderr); },
-           "Where log lines go, stderr unless told otherwise")
-        ->check(wantsOneOf({"syslog", "stderr"}))
+           "Where log lines go; the default is stderr")
+        ->check(oneOf({"syslog", "stderr"}))
         ->type_name("syslog|stderr");
     app.add_option("--log-level", line.logLevel,
-                   "The least urgent log lines that are written, 0 to 7; 3 unless told otherwise")
-        ->check(wantsLogLevel())
+                   "The least urgent log lines that are written, 0 to 7; the default is 3")
+        ->check(validLogLevel())
         ->type_name("N");
     app.footer("Exit status: 0 done, 1 the input was bad, 2 usage.\n\n"
                "Examples:\n"
@@ -73,10 +74,10 @@ CommandLine parseCommandLine(int count, const char* const* arguments) {
         std::ostringstream out;
         std::ostringstream ignored;
         if (app.exit(error, out, ignored) == 0)
-            line.command = CommandLine::Words{ExitStatus::Done, out.str()};
+            line.command = CommandLine::Notice{ExitStatus::Done, out.str()};
         else
-            line.command = CommandLine::Words{ExitStatus::Usage, "velmora-log: " + whatIsWrong(app, error) +
-                                                                     "\nvelmora-log --help tells more\n"};
+            line.command = CommandLine::Notice{ExitStatus::Usage, "velmora-log: " + usageError(app, error) +
+                                                                      "\nsee velmora-log --help\n"};
         return line;
     }
     if (decodeCommand->parsed())

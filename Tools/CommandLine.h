@@ -16,17 +16,17 @@
 
 namespace velmora {
 
-/// What the user asked for.
+/// The parsed command line.
 struct CommandLine {
     /// The program prints a text and ends: help, its version, a usage error.
-    struct Words {
+    struct Notice {
         int status; ///< exit status; a usage error goes to standard error, the others to standard output
-        std::string text; ///< whole lines
+        std::string text; ///< complete lines
     };
 
     LogKind log = LogKind::Stderr;
     int logLevel = LogPriority::Error;
-    std::variant<Words, DecodeOptions, WatchOptions, RecordOptions, ConvertOptions, InfoOptions> command;
+    std::variant<Notice, DecodeOptions, WatchOptions, RecordOptions, ConvertOptions, InfoOptions> command;
 };
 
 /// Parses the arguments, the program's name first. Never ends the program.

@@ -11,27 +11,27 @@
 
 namespace velmora {
 
-CLI::Validator wants(std::function<bool(const std::string&)> isGood, const std::string& wanted) {
+CLI::Validator validator(std::function<bool(const std::string&)> isValid, const std::string& expected) {
     return CLI::Validator(
-        [isGood = std::move(isGood), wanted](const std::string& text) {
-            return isGood(text) ? std::string() : "got " + text + ", wanted " + wanted;
+        [isValid = std::move(isValid), expected](const std::string& text) {
+            return isValid(text) ? std::string() : "got " + text + ", wanted " + expected;
         },
         "");
 }
 
-CLI::Validator wantsOneOf(const std::vector<std::string>& words) {
-    std::string wanted;
+CLI::Validator oneOf(const std::vector<std::string>& words) {
+    std::string expected;
     for (const std::string& word : words)
-        wanted += (wanted.empty() ? "" : " or ") + word;
-    return wants(
+        expected += (expected.empty() ? "" : " or ") + word;
+    return validator(
         [words](const std::string& text) {
             return std::find(words.begin(), words.end(), text) != words.end();
         },
-        wanted);
+        expected);
 }
 
-CLI::Validator wantsCount() {
-    return wants(
+CLI::Validator positiveCount() {
+    return validator(
         [](const std::string& text) {
             std::uint64_t count = 0;
             return CLI::detail::lexical_cast(text, count) && count > 0;
@@ -42,7 +42,7 @@ CLI::Validator wantsCount() {
 void addTechnology(CLI::App& command, std::string& technology, const std::string& purpose) {
     command
         .add_option("--technology", technology,
-                    purpose + " this technology, whatever the file says: " + technologyNames())
+                    purpose + " this technology, overriding the file's: " + technologyNames())
         ->type_name("NAME");
 }
 

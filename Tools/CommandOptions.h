@@ -12,13 +12,14 @@
 namespace velmora {
 
 /// What the options of several commands have in common. Checks fail with what the option got and what it
-/// wanted.
+/// expected.
 
-/// `wanted` describes the texts for which `isGood` holds.
-[[nodiscard]] CLI::Validator wants(std::function<bool(const std::string&)> isGood, const std::string& wanted);
-[[nodiscard]] CLI::Validator wantsOneOf(const std::vector<std::string>& words);
+/// Accepts the texts for which `isValid` holds; `expected` describes them in messages.
+[[nodiscard]] CLI::Validator validator(std::function<bool(const std::string&)> isValid,
+                                       const std::string& expected);
+[[nodiscard]] CLI::Validator oneOf(const std::vector<std::string>& words);
 /// A whole number above 0.
-[[nodiscard]] CLI::Validator wantsCount();
+[[nodiscard]] CLI::Validator positiveCount();
 
 /// `--technology`, with a description that begins with `purpose`.
 void addTechnology(CLI::App& command, std::string& technology, const std::string& purpose);

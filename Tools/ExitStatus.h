@@ -3,11 +3,11 @@
 
 #pragma once
 
-/// What velmora-log ends with.
+/// The exit status of velmora-log.
 namespace velmora::ExitStatus {
 
 inline constexpr int Done = 0;
-inline constexpr int BadInput = 1; ///< what was to be read, or where it was to be written, gave trouble
+inline constexpr int BadInput = 1; ///< the input was bad, or the output could not be written
 inline constexpr int Usage = 2;
 
 } // namespace velmora::ExitStatus

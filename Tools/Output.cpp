@@ -63,7 +63,7 @@ void Output::write(std::string_view rest) {
     }
 }
 
-bool Output::hasLostReader() const {
+bool Output::hasClosedReader() const {
     pollfd watched{_descriptor, 0, 0};
     return ::poll(&watched, 1, 0) > 0 && (watched.revents & POLLERR) != 0;
 }

@@ -32,7 +32,7 @@ public:
     [[nodiscard]] State state() const { return _state; }
     [[nodiscard]] bool isOpen() const { return _state == State::Open; }
     /// Whether the reader has closed the pipe; polls, and writes nothing.
-    [[nodiscard]] bool hasLostReader() const;
+    [[nodiscard]] bool hasClosedReader() const;
 
 private:
     void write(std::string_view rest);

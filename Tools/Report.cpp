@@ -39,11 +39,11 @@ std::string fileTitle(const std::string& path) {
     return path == "-" ? "standard input" : path;
 }
 
-std::string alreadyThere(const std::string& path) {
+std::string fileExistsMessage(const std::string& path) {
     return path + " is there already; --force overwrites it";
 }
 
-std::string placeInFile(std::string_view title, std::uint64_t number, std::uint64_t offset) {
+std::string positionInFile(std::string_view title, std::uint64_t number, std::uint64_t offset) {
     std::string place(title);
     if (number != 0)
         place += ": record " + std::to_string(number) + " at offset " + std::to_string(offset);
@@ -57,13 +57,13 @@ WorkContext::~WorkContext() {
     currentContext = _earlier;
 }
 
-void WorkContext::takeOverTermination() {
+void WorkContext::installTerminateHandler() {
     std::set_terminate(&WorkContext::terminate);
 }
 
 void WorkContext::terminate() noexcept {
-    // Nothing here asks for memory, since there may be none left.
-    const char* const reason = reasonOfTermination();
+    // Allocates nothing, since memory may be exhausted.
+    const char* const reason = terminationReason();
     const WorkContext* const context = currentContext;
     if (!context)
         std::snprintf(lastWords, sizeof lastWords, "velmora-log: %s\n", reason);

@@ -13,14 +13,14 @@ namespace velmora {
 /// Writes a message to standard error: "velmora-log: " and the text, in one write.
 void report(std::string_view text);
 
-/// How messages call a file: "standard input" for "-".
+/// A file's name in messages: "standard input" for "-".
 [[nodiscard]] std::string fileTitle(const std::string& path);
 
 /// The message of a command that refuses to overwrite a file.
-[[nodiscard]] std::string alreadyThere(const std::string& path);
+[[nodiscard]] std::string fileExistsMessage(const std::string& path);
 
 /// "TITLE: record N at offset O", or the title alone where there is no record (number 0).
-[[nodiscard]] std::string placeInFile(std::string_view title, std::uint64_t number, std::uint64_t offset);
+[[nodiscard]] std::string positionInFile(std::string_view title, std::uint64_t number, std::uint64_t offset);
 
 /// What the program is working on, for the message that it ends with when a decoder ends it: some failures of
 /// the decoders are meant to end the program and are caught nowhere. The latest one counts. Main thread only.
@@ -40,7 +40,7 @@ public:
 
     /// From now on an uncaught exception ends the program with "velmora-log: PLACE: REASON" on
     /// standard error and exit status 1.
-    static void takeOverTermination();
+    static void installTerminateHandler();
 
 private:
     [[noreturn]] static void terminate() noexcept;

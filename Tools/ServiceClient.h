@@ -27,7 +27,7 @@ public:
     [[nodiscard]] ModelPlatform platform();
 };
 
-/// What messages call the other end.
+/// The other end's name in messages.
 inline constexpr const char* serviceTitle = "the telephony service";
 
 } // namespace velmora

@@ -36,7 +36,7 @@ void keepStandardStreams() {
         ::close(descriptor);
 }
 
-int say(const CommandLine::Words& words, Output& output) {
+int say(const CommandLine::Notice& words, Output& output) {
     if (words.status == ExitStatus::Usage) {
         std::fputs(words.text.c_str(), stderr);
         return words.status;
@@ -54,11 +54,11 @@ int runVelmoraLog(int count, const char* const* arguments) {
     redirectConsole(stderr);
     std::signal(SIGPIPE, SIG_IGN); // the write that meets a closed pipe reports it
     std::signal(SIGXFSZ, SIG_IGN); // and so does one that meets a limit on the file's size
-    WorkContext::takeOverTermination();
+    WorkContext::installTerminateHandler();
 
     const CommandLine line = parseCommandLine(count, arguments);
     Output output(STDOUT_FILENO);
-    if (const auto* words = std::get_if<CommandLine::Words>(&line.command))
+    if (const auto* words = std::get_if<CommandLine::Notice>(&line.command))
         return say(*words, output);
 
     const ProgramLog log(line.log, line.logLevel, "velmora-log");

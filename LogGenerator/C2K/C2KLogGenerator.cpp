@@ -19,7 +19,7 @@ namespace {
 
 constexpr std::string_view sortedMarker = "_sorted";
 
-/// The template, or none. Why there is none is told beside the error line that the caller writes.
+/// The template, or none. The reason is logged in addition to the caller's error line.
 Value loadTemplate() {
     const Result<Data> file = resources().read("C2KTemplate", "plist");
     if (!file) {

@@ -45,7 +45,7 @@ private:
 
     struct Object {
         unsigned type = 0;
-        std::size_t count = 0; ///< the low half of the marker, or the count behind it
+        std::size_t count = 0; ///< the low half of the marker, or the count after it
         std::size_t content = 0;
     };
 

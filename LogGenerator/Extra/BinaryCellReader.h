@@ -12,8 +12,8 @@ namespace velmora {
 
 /// Reads the binary form of the cell information array as the telephony service writes it: an array of
 /// dictionaries whose values are short ASCII strings and integers of up to 64 bits. Appends the cells.
-/// Everything else - false - is left to the property-list reader; what this reader takes, that one would
-/// take, and would find the same in it.
+/// Everything else - false - is left to the property-list reader; what this reader accepts, that one would
+/// accept with the same result.
 [[nodiscard]] bool readBinaryCells(Bytes list, std::vector<Cell>& cells);
 
 } // namespace velmora

@@ -13,7 +13,7 @@ namespace velmora {
 
 namespace {
 
-/// A payload that is longer is read anew by every section, and so not kept in memory.
+/// A longer payload is read again by every section, and so not cached.
 constexpr std::size_t longestKept = std::size_t{1} << 16;
 
 /// A cell of the array as the property-list reader gave it.

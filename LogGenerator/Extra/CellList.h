@@ -12,8 +12,8 @@
 
 namespace velmora {
 
-/// The cell information array of the record that came last, read once for all sections that want it. Shared
-/// by the sections of a class index.
+/// The cell information array of the latest record, read once for all sections that use it. Shared by the
+/// sections of a class index.
 class CellList {
 public:
     /// The cells of the record, in the list's order, but what is no cell; null where the payload holds no

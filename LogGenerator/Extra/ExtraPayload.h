@@ -16,11 +16,11 @@
 
 namespace velmora {
 
-/// The extra stream's payload readers. Each is built from a whole record, reads the property list behind the
-/// 13-byte header and holds what it found for as long as it lives.
+/// The extra stream's payload readers. Each is built from a whole record, reads the property list after the
+/// 13-byte header and keeps the result.
 
-/// The payloads that a section read last and what they held. The SIM's files and the contexts are told again
-/// and again without having changed, or as they were before, in both forms by turns: some of them are kept.
+/// A cache of a section's latest payloads and their values. The SIM's files and the contexts are sent
+/// repeatedly without having changed, or as before, alternately in both forms: some of them are cached.
 class RememberedPayloads {
 public:
     /// What the record's payload holds, as readPropertyList gives it.
@@ -37,7 +37,7 @@ private:
 
 namespace LogCode_0xFF0000 {
 
-/// A SIM-file payload that is no property list. Nothing catches it: it ends the program, and that is meant.
+/// A SIM-file payload that is no property list. It is not caught and ends the program, as intended.
 class UnknownDataException : public std::exception {
 public:
     [[nodiscard]] const char* what() const noexcept override {

@@ -31,7 +31,7 @@ public:
         const std::size_t end = _rest.find_first_not_of(" \t\n");
         _rest.remove_prefix(std::min(end, _rest.size()));
     }
-    /// A tag behind white space.
+    /// A tag after white space.
     [[nodiscard]] bool tag(std::string_view token) {
         passSpace();
         return take(token);
@@ -118,7 +118,7 @@ const XMLCellReader::Stretch* XMLCellReader::stretchAt(std::string_view rest, bo
     return &_stretches[found];
 }
 
-/// Takes the stretch apart that `rest` begins with. There is a cell at hand, unless the list begins.
+/// Parses the segment at the start of `rest`. There is a current cell, unless the list starts.
 bool XMLCellReader::learn(std::string_view rest, bool begins) {
     Stretch stretch;
     stretch.begins = begins;

@@ -14,12 +14,12 @@ namespace velmora {
 
 /// Reads the XML form of the cell information array as the telephony service writes it: an array of
 /// dictionaries whose values are strings and plain decimal integers. Everything else is left to the
-/// property-list reader; what this reader takes, that one would take, and would find the same in it.
+/// property-list reader; what this reader accepts, that one would accept with the same result.
 ///
-/// The lists that come one after another differ in little but their numbers. So the reader remembers the
-/// stretches between two numbers (the end of one tag, keys, texts, the beginning of the next number) with
-/// what they say of the cells. A stretch that it meets again is compared and not taken apart: the place right
-/// behind a number is always the same place of the grammar, so that the same text there means the same.
+/// The lists that come one after another differ in little but their numbers. So the reader caches the
+/// segments between two numbers (the end of one tag, keys, texts, the start of the next number) with their
+/// meaning. A known segment is compared and not parsed again: the position right after a number is always the
+/// same state of the grammar, so that the same text there has the same meaning.
 class XMLCellReader {
 public:
     /// Appends the cells; false where the text is not of that form.
@@ -30,7 +30,7 @@ private:
     static constexpr std::uint8_t noNumber = 0xFF; ///< the list ends here
     static constexpr std::uint8_t unknownNumber = 0xFE;
 
-    /// One thing that a stretch says.
+    /// One element of a segment's meaning.
     struct Step {
         enum class Kind : std::uint8_t { BeginCell, Technology, Type, NotANumber };
         Kind kind = Kind::BeginCell;
@@ -38,10 +38,10 @@ private:
     };
     struct Stretch {
         std::string text;
-        bool begins = false; ///< it stands at the list's beginning, not behind a number
+        bool begins = false; ///< it is at the list's start, not after a number
         std::vector<Step> steps;
         std::uint8_t number = noNumber; ///< the place of the number that follows
-        std::size_t next = 0;           ///< which stretch followed the last time
+        std::size_t next = 0;           ///< which segment followed last time
     };
 
     [[nodiscard]] const Stretch* stretchAt(std::string_view rest, bool begins);

@@ -8,7 +8,7 @@
 
 namespace velmora {
 
-/// An assertion about what a serialized-object baseband sends that does not hold. Nothing catches it: it ends
+/// An assertion about what a serialized-object baseband sends that does not hold. It is not caught and ends
 /// the program, naming the description, the source file and the line.
 class AssertionFailure : public std::logic_error {
 public:

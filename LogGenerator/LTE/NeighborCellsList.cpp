@@ -57,7 +57,7 @@ void NeighborCellsList::check(const View& view, const Record& record) const {
     const CountedList& cells = measurement.cells();
     logFormat(LogPriority::Warning, "Number of neighboring cells being reported: %d\n",
               static_cast<int>(cells.count()));
-    if (systemLogWants(LogPriority::Warning))
+    if (isLogged(LogPriority::Warning))
         for (std::size_t i = 0; i < cells.whole(); ++i)
             traceCell(cells[i]);
     reportMissingEntries(cells, view.code);

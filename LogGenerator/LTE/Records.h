@@ -31,7 +31,7 @@ public:
                     static_cast<std::size_t>(detectedCount.read(record))) {}
 
     [[nodiscard]] const CountedList& neighbours() const { return _neighbours; }
-    /// They lie behind as many neighbours as are announced, whether or not the record holds those.
+    /// They lie after the counted neighbours, whether or not the record holds those.
     [[nodiscard]] const CountedList& detected() const { return _detected; }
 
 private:
@@ -40,7 +40,7 @@ private:
 };
 
 /// How 0xB179 shows a filtered level and quality, of the serving cell and of the neighbours alike. The
-/// quality's offset is not that of the idle-mode records (-30), on purpose.
+/// quality's offset differs from that of the idle-mode records (-30), as intended.
 inline constexpr TextFormat filteredRSRP = real("%4.2f dBm", 0.25, -140);
 inline constexpr TextFormat filteredRSRQ = real("%4.2f dB", 0.125, -20);
 
@@ -63,14 +63,14 @@ private:
     CountedList _cells;
 };
 
-/// 0xB186, the reselection candidates: a header, then a header of four bytes a candidate. What belongs to the
-/// candidate's radio technology is read from behind its header, where the next candidate's lies: the entries
-/// overlap, and that is meant.
+/// 0xB186, the reselection candidates: a header, then a header of four bytes a candidate. The fields of the
+/// candidate's radio technology are read from after its header, where the next candidate's header lies: the
+/// entries overlap, as intended.
 class ReselectionRecord {
 public:
     static constexpr std::uint32_t code = 0xB186;
     static constexpr std::size_t minimumLength = 21;
-    /// The low byte of a 16-bit field: 256 candidates are none, on purpose.
+    /// The low byte of a 16-bit field: 256 candidates count as none, as intended.
     static constexpr Place count = u8At(19);
     static_assert(count.end() <= minimumLength);
     static constexpr std::size_t stride = 4;

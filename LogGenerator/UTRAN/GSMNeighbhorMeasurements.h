@@ -7,9 +7,8 @@
 
 namespace velmora {
 
-/// "GSM Neighbor Cell List": empty after every record. The rows of the GSM cells that the phone measures are
-/// made and then discarded, on purpose: the list is not to show them. (The class keeps the baseband's own
-/// spelling.)
+/// "GSM Neighbor Cell List": empty after every record. The rows of the measured GSM cells are made and then
+/// discarded, as intended: the list does not show them. (The class keeps the baseband's own spelling.)
 class GSMNeighbhorMeasurements final : public Base {
 public:
     [[nodiscard]] std::string_view getSectionName() const override { return "GSM Neighbor Cell List"; }

@@ -76,7 +76,7 @@ void RRC_State::unknownCode(std::uint32_t) const {}
 void RRC_State::updateWithData(const Data& data, std::uint32_t logCode) {
     Base::updateWithData(data, logCode);
     const Record record(data);
-    if (!viewOf(logCode) || !systemLogWants(LogPriority::Warning))
+    if (!viewOf(logCode) || !isLogged(LogPriority::Warning))
         return;
     const std::int64_t current = modeOf(record);
     logFormat(LogPriority::Warning, "Display Dict = %s, rrc mode = %d %s", description(node()).c_str(),

@@ -8,7 +8,7 @@
 
 namespace velmora {
 
-/// Keeps a line that a peer can provoke from filling the log: lets one pass in every `interval`.
+/// Limits the rate of a log line that a peer can provoke to one per `interval`.
 class LogLimiter {
 public:
     explicit LogLimiter(std::chrono::nanoseconds interval) : _interval(interval) {}

@@ -8,9 +8,9 @@
 
 namespace velmora {
 
-/// A timer on the event loop, stopped until it is started. The owner may start, stop or destroy it from its
-/// own action. Its action runs at most once a turn of the loop, so that work cut into slices by a timer of no
-/// delay lets sockets, other timers and the screen have their turn in between. Main thread only.
+/// A timer on the event loop, initially stopped. The owner may start, stop or destroy it from its own action.
+/// Its action runs at most once per iteration of the loop, so that work split by a zero-delay timer is
+/// interleaved with sockets, other timers and the screen. Main thread only.
 class LoopTimer {
 public:
     explicit LoopTimer(std::function<void()> action);
@@ -18,9 +18,9 @@ public:
     LoopTimer(const LoopTimer&) = delete;
     LoopTimer& operator=(const LoopTimer&) = delete;
 
-    /// Runs the action once when `delay` has passed, never earlier. Starting again begins anew.
+    /// Runs the action once when `delay` has passed, never earlier. Starting it again restarts the delay.
     void startOnce(std::chrono::nanoseconds delay);
-    /// Runs the action every `interval` (a millisecond at least). Missed ticks are not made up for.
+    /// Runs the action every `interval` (a millisecond at least). Missed ticks are skipped.
     void startRepeating(std::chrono::nanoseconds interval);
     void stop();
     [[nodiscard]] bool isRunning() const;

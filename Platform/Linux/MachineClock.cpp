@@ -14,7 +14,8 @@ Time MachineClock::now() const {
 }
 
 ZoneState MachineClock::zoneAt(Time moment) const {
-    // localtime_r looks at TZ only the first time; a zone that is changed while the program runs shall show.
+    // localtime_r need not read TZ again after its first call, so tzset picks up a zone that changes at run
+    // time.
     ::tzset();
     const std::time_t seconds = std::chrono::floor<std::chrono::seconds>(moment).time_since_epoch().count();
     std::tm local{};

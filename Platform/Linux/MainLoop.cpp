@@ -13,7 +13,7 @@ namespace velmora {
 
 class MainLoop::Impl {
 public:
-    // The arguments are the program's own business; Qt's application object only needs some to look at.
+    // The program parses its own arguments; QCoreApplication requires some that outlive it.
     char _name[8] = "velmora";
     char* _arguments[2] = {_name, nullptr};
     int _count = 1;

@@ -18,14 +18,14 @@ public:
     MainLoop(const MainLoop&) = delete;
     MainLoop& operator=(const MainLoop&) = delete;
 
-    /// Serves events until `quit`; returns its status.
+    /// Processes events until `quit`; returns its status.
     [[nodiscard]] int run();
     /// Ends `run` with that status once the current event is done. Called before `run`, it makes that return
-    /// at once. The first status counts.
+    /// at once. The first status is used.
     void quit(int status);
 
-    /// Serves events until `done` says so, looked at after every turn of the loop; false when `limit` has
-    /// passed before that.
+    /// Processes events until `done` returns true, which is checked after every iteration of the loop; false
+    /// when `limit` has passed before that.
     [[nodiscard]] bool runUntil(const std::function<bool()>& done, std::chrono::nanoseconds limit);
 
 private:

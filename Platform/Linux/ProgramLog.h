@@ -18,11 +18,11 @@ enum class LogKind { Syslog, Stderr };
 /// "syslog" or "stderr"; absent for anything else.
 [[nodiscard]] std::optional<LogKind> logKindNamed(std::string_view name);
 
-/// Puts a log of that kind in place for as long as it lives; after it lines go nowhere. This is what
-/// `--log` and `--log-level` ask for, held by `main` for the length of the program.
+/// Installs a log of that kind during its lifetime; afterwards lines are discarded. Held by `main`, for
+/// `--log` and `--log-level`.
 class ProgramLog {
 public:
-    /// `level` is 0 to 7: lines whose priority is above it are left out. `identity` is the program's name.
+    /// `level` is 0 to 7: lines of a higher priority value are discarded. `identity` is the program's name.
     ProgramLog(LogKind kind, int level, std::string identity);
     ~ProgramLog();
     ProgramLog(const ProgramLog&) = delete;

@@ -10,10 +10,10 @@
 namespace velmora {
 
 /// The main queue on the event loop of the thread that makes it (the main thread, which alone uses it). The
-/// loop is run by whoever owns it: MainLoop in programs without screens. What is still queued when the queue
-/// is destroyed does not run; timers outlive it.
+/// loop is run by its owner: MainLoop in programs without screens. Tasks that are queued when the queue is
+/// destroyed do not run; timers outlive it.
 ///
-/// A task that throws ends the program: nothing catches on the way to the event loop.
+/// A task that throws ends the program: no handler exists up to the event loop.
 class QtMainQueue final : public MainQueue {
 public:
     QtMainQueue();

@@ -26,7 +26,7 @@ std::string addressFromEnvironment() {
     return address ? address : "";
 }
 
-void complain(const std::string& address, const std::string& why) {
+void logFailure(const std::string& address, const std::string& why) {
     logFormat(LogPriority::Error, "service manager at %s: %s", address.c_str(), why.c_str());
 }
 
@@ -39,11 +39,11 @@ ServiceManager::ServiceManager(std::string address) : _address(std::move(address
     if (_address.empty())
         return;
     if (_address.front() != '/' && _address.front() != '@') {
-        complain(_address, "no socket's name, wanted an absolute path or '@' and a name");
+        logFailure(_address, "no socket's name, wanted an absolute path or '@' and a name");
         _address.clear();
     } else if (_address.size() >= sizeof limits.sun_path) {
-        complain(_address, "a name of " + std::to_string(_address.size()) + " bytes, wanted at most " +
-                               std::to_string(sizeof limits.sun_path - 1));
+        logFailure(_address, "a name of " + std::to_string(_address.size()) + " bytes, wanted at most " +
+                                 std::to_string(sizeof limits.sun_path - 1));
         _address.clear();
     }
 }
@@ -73,7 +73,7 @@ void ServiceManager::send(std::string_view message) const {
     const FileDescriptor socket(::socket(AF_UNIX, SOCK_DGRAM | SOCK_CLOEXEC | SOCK_NONBLOCK, 0));
     if (!socket || ::sendto(socket.get(), message.data(), message.size(), MSG_NOSIGNAL,
                             reinterpret_cast<const sockaddr*>(&address), size) < 0)
-        complain(_address, errnoText(errno));
+        logFailure(_address, errnoText(errno));
 }
 
 } // namespace velmora

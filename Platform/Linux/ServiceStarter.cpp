@@ -89,7 +89,7 @@ Result<Done> startProgram(std::chrono::milliseconds patience) {
 
 } // namespace
 
-Result<Done> bringUpTelephonyService(std::chrono::milliseconds patience) {
+Result<Done> startTelephonyService(std::chrono::milliseconds patience) {
     if (answers())
         return Done();
     // A unit's ports are in the standard directory; where another one is named it would not be found.

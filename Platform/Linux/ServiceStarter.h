@@ -9,11 +9,11 @@
 
 namespace velmora {
 
-/// Brings up the telephony service where none answers in the user's port directory: the unit
+/// Starts the telephony service if none answers in the user's port directory: the unit
 /// "velmora-telephonyd.service" where the user's service manager has it, else the program
 /// "velmora-telephonyd" as a process of its own, which outlives this one. Blocks for up to `patience` for
-/// each of the two ways. What was started is a log line; the failure says what the last way came to. Main
-/// thread only, on its event loop.
-Result<Done> bringUpTelephonyService(std::chrono::milliseconds patience = std::chrono::seconds(5));
+/// each of the two ways. What was started is a log line; the failure is that of the last way. Main thread
+/// only, on its event loop.
+Result<Done> startTelephonyService(std::chrono::milliseconds patience = std::chrono::seconds(5));
 
 } // namespace velmora

@@ -22,7 +22,7 @@ static_assert(std::atomic<int>::is_always_lock_free, "a signal handler may use n
 extern "C" void velmoraForwardSignal(int signalNumber) {
     const int error = errno;
     const auto byte = static_cast<unsigned char>(signalNumber);
-    // A full pipe already holds more signals than anybody needs to hear of.
+    // A full pipe already holds more signals than are needed.
     [[maybe_unused]] const auto written = ::write(signalPipe.load(), &byte, 1);
     errno = error;
 }

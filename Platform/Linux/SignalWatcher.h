@@ -14,15 +14,14 @@ namespace velmora {
 
 /// Turns SIGINT and SIGTERM into a call on the main thread, so that a program stops cleanly, and lets SIGPIPE
 /// be ignored, so that writing to a closed pipe is an error like any other. One a process at a time;
-/// destroying it puts back what the process did with these signals before. Main thread only, on its event
-/// loop.
+/// destroying it restores the earlier signal handlers. Main thread only, on its event loop.
 class SignalWatcher {
 public:
     using Callback = std::function<void(int signalNumber)>;
 
-    /// The callback runs on the event loop for every signal that arrives, and may destroy the watcher.
-    /// Throws std::system_error when the process can have no more file descriptors, std::logic_error when
-    /// there is a watcher already.
+    /// The callback runs on the event loop for every signal that arrives, and may destroy the watcher. Throws
+    /// std::system_error when the process is out of file descriptors, std::logic_error when there is a
+    /// watcher already.
     explicit SignalWatcher(Callback callback);
     ~SignalWatcher();
     SignalWatcher(const SignalWatcher&) = delete;

@@ -9,9 +9,9 @@
 
 namespace velmora {
 
-/// Lines go to standard error as service managers read them: "<P>text", P the priority (0 to 7). A line feed
-/// that ends the text ends the line; one inside it is shown as a blank, so that a line stays a line. Each
-/// line is one write(2), so that lines of several processes do not run into each other.
+/// Writes lines to standard error in the form that service managers read: "<P>text", P the priority (0 to 7).
+/// A trailing line feed ends the line; others are written as blanks. Each line is one write(2), so that lines
+/// of several processes are not interleaved.
 class StderrLog final : public SystemLog {
 public:
     StderrLog();

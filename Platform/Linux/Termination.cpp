@@ -21,7 +21,7 @@ const char* programName = "";
 
 [[noreturn]] void endProgram() noexcept {
     char text[1024];
-    std::snprintf(text, sizeof text, "%s: %s\n", programName, reasonOfTermination());
+    std::snprintf(text, sizeof text, "%s: %s\n", programName, terminationReason());
     writeToStandardError(text);
     // No destructor runs: the program's objects are as the failure left them.
     std::_Exit(failed);
@@ -29,7 +29,7 @@ const char* programName = "";
 
 } // namespace
 
-const char* reasonOfTermination() noexcept {
+const char* terminationReason() noexcept {
     // The text belongs to the exception, which so lives as long as the program.
     static std::exception_ptr exception;
     exception = std::current_exception();

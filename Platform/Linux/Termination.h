@@ -7,14 +7,14 @@
 
 namespace velmora {
 
-/// How a program ends when an exception is caught nowhere, memory that cannot be had among them: with a line
-/// that tells why, and without a core file. Nothing here asks for memory, since there may be none left.
+/// How a program ends on an uncaught exception, out of memory included: with a line that gives the reason,
+/// and without a core file. Nothing here allocates, since memory may be exhausted.
 
-/// Why, for a terminate handler: "out of memory", what the exception says of itself, or that there is none.
-/// Good until the program has ended.
-[[nodiscard]] const char* reasonOfTermination() noexcept;
+/// The reason, for a terminate handler: "out of memory", the exception's what(), or that there is no
+/// exception. Valid until the program ends.
+[[nodiscard]] const char* terminationReason() noexcept;
 
-/// Writes the text to standard error, as far as that can be.
+/// Writes the text to standard error, ignoring errors.
 void writeToStandardError(std::string_view text) noexcept;
 
 /// From now on such an exception ends the program with "PROGRAM: REASON" on standard error and exit status 1.

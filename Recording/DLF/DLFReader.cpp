@@ -3,17 +3,17 @@
 
 #include "Recording/DLF/DLFReader.h"
 
-#include "Recording/Files/InputBegin.h"
+#include "Recording/Files/InputStart.h"
 
 namespace velmora {
 
 Result<std::unique_ptr<DLFReader>> DLFReader::open(ChunkedInput input, std::string_view wanted) {
     std::unique_ptr<DLFReader> reader(new DLFReader(std::move(input)));
-    const bool isLog = reader->_records.beginsSurely();
+    const bool isLog = reader->_records.looksLikeRecords();
     if (reader->failure() && !isLog)
         return *reader->failure();
     if (!isLog)
-        return Failure{unexpectedBegin(reader->_records.available(), wanted)};
+        return Failure{unexpectedStart(reader->_records.available(), wanted)};
     reader->lookAhead();
     return reader;
 }

@@ -30,7 +30,7 @@ std::string whyUnfit(Bytes message) {
                std::to_string(LogMessage::headerLength) + " at least";
     if (parsed->length() != parsed->record.size() - 1)
         return "record length " + std::to_string(parsed->length()) + " in a message whose record has " +
-               std::to_string(parsed->record.size() - 1) + " bytes behind its type";
+               std::to_string(parsed->record.size() - 1) + " bytes after its type";
     return {};
 }
 
@@ -49,7 +49,7 @@ Result<std::unique_ptr<DLFWriter>> DLFWriter::adopt(int descriptor, std::string 
     return start(std::make_unique<DescriptorFile>(descriptor, true), std::move(name), clock);
 }
 
-Result<std::unique_ptr<DLFWriter>> DLFWriter::start(std::unique_ptr<RecordingFile> file, std::string name,
+Result<std::unique_ptr<DLFWriter>> DLFWriter::start(std::unique_ptr<OutputFile> file, std::string name,
                                                     const Clock& clock) {
     std::unique_ptr<DLFWriter> writer(new DLFWriter(std::move(file), std::move(name)));
     writer->_buffer.resize(dlfVersionReportSize);
@@ -61,12 +61,12 @@ Result<std::unique_ptr<DLFWriter>> DLFWriter::start(std::unique_ptr<RecordingFil
     return writer;
 }
 
-DLFWriter::DLFWriter(std::unique_ptr<RecordingFile> file, std::string name)
+DLFWriter::DLFWriter(std::unique_ptr<OutputFile> file, std::string name)
     : _file(std::move(file)), _name(std::move(name)) {}
 
 DLFWriter::~DLFWriter() {
     const Result<Done> closed = close();
-    static_cast<void>(closed); // whoever wants to know has closed it before
+    static_cast<void>(closed); // callers that need the result call close themselves
 }
 
 Result<Done> DLFWriter::append(Bytes message) {
@@ -86,7 +86,7 @@ Result<Done> DLFWriter::append(Bytes message) {
 
 Result<Done> DLFWriter::flush() {
     for (Bytes rest = _buffer; !rest.empty() && !_failure;) {
-        const RecordingFile::Written written = _file->write(rest);
+        const OutputFile::Written written = _file->write(rest);
         if (written.error != 0)
             _failure = failureOf("write", written.error);
         rest = rest.subspan(written.bytes);

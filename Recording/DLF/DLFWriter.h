@@ -6,7 +6,7 @@
 #include "Platform/Bytes.h"
 #include "Platform/Clock.h"
 #include "Platform/Result.h"
-#include "Recording/Files/RecordingFile.h"
+#include "Recording/Files/OutputFile.h"
 
 #include <cstdint>
 #include <memory>
@@ -16,10 +16,10 @@
 
 namespace velmora {
 
-/// Writes a DLF log: the version report, then one record a message, so that DLFReader gives the same messages
-/// again, byte for byte. A record is written without its type byte, as the format has it, where its code
-/// implies the type (see impliedType). Any other message is written as it arrived, with type byte and prefix,
-/// as in the application's own logs.
+/// Writes a DLF log: the version report, then one record a message, so that DLFReader returns the same
+/// messages again, byte for byte. A record is written without its type byte, as the format has it, where its
+/// code implies the type (see impliedType). Any other message is written as it arrived, with type byte and
+/// prefix, as in the application's own logs.
 ///
 /// The log keeps no times but those in the records. A message that a reader could not find the end of,
 /// because it has no whole header or its length field is not its length, is refused. Once writing has failed
@@ -28,12 +28,12 @@ namespace velmora {
 class DLFWriter {
 public:
     /// Creates the file, or empties it; "-" is standard output, which stays open afterwards. The version
-    /// report, with the clock's time and what the resources say of this program, is written at once.
+    /// report, with the clock's time and this program's version from the resources, is written immediately.
     static Result<std::unique_ptr<DLFWriter>> create(const std::string& path, const Clock& clock);
     /// Writes to an open descriptor, which it takes over; failures name it `name`.
     static Result<std::unique_ptr<DLFWriter>> adopt(int descriptor, std::string name, const Clock& clock);
     /// Writes to any file of which nothing has been written.
-    static Result<std::unique_ptr<DLFWriter>> start(std::unique_ptr<RecordingFile> file, std::string name,
+    static Result<std::unique_ptr<DLFWriter>> start(std::unique_ptr<OutputFile> file, std::string name,
                                                     const Clock& clock);
 
     ~DLFWriter();
@@ -54,12 +54,12 @@ public:
     [[nodiscard]] bool hasFailed() const { return _failure.has_value(); }
 
 private:
-    DLFWriter(std::unique_ptr<RecordingFile> file, std::string name);
+    DLFWriter(std::unique_ptr<OutputFile> file, std::string name);
 
     Result<Done> flush();
     [[nodiscard]] Failure failureOf(const char* operation, int error) const;
 
-    std::unique_ptr<RecordingFile> _file; ///< null when closed
+    std::unique_ptr<OutputFile> _file; ///< null when closed
     std::string _name;
     std::vector<std::uint8_t> _buffer; ///< whole records
     std::uint64_t _messages = 0;

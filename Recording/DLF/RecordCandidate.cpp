@@ -19,17 +19,17 @@ bool isStream(std::uint8_t type) {
     return type == LogMessage::basebandType || type == LogMessage::extraType;
 }
 
-/// What the lead says; none where the bytes do not have it.
-std::optional<int> evidenceOfLead(Bytes bytes, Lead lead, const RecordWeights& weights) {
-    if (lead == Lead::Nothing)
+/// The score of the framing; absent where the bytes do not have it.
+std::optional<int> scoreOfFraming(Bytes bytes, Framing framing, const RecordWeights& weights) {
+    if (framing == Framing::Nothing)
         return 0;
-    const bool hasType = isStream(bytes[sizeOf(lead) - 1]);
-    switch (lead) {
-    case Lead::Prefix:
+    const bool hasType = isStream(bytes[sizeOf(framing) - 1]);
+    switch (framing) {
+    case Framing::Prefix:
         if (bytes[0] != LogMessage::prefixMarker)
             return std::nullopt;
         return weights.prefix + (hasType ? weights.type : 0);
-    case Lead::OtherType:
+    case Framing::OtherType:
         if (hasType)
             return std::nullopt;
         return 0;
@@ -40,8 +40,8 @@ std::optional<int> evidenceOfLead(Bytes bytes, Lead lead, const RecordWeights& w
     }
 }
 
-int evidenceOfTimestamp(std::uint64_t timestamp, std::optional<std::uint64_t> nearby,
-                        const RecordWeights& weights) {
+int timestampScore(std::uint64_t timestamp, std::optional<std::uint64_t> nearby,
+                   const RecordWeights& weights) {
     constexpr std::uint64_t day = std::uint64_t{86'400} * 800; // in units of 1.25 ms
     if (timestamp == 0)
         return nearby.value_or(0) == 0 ? weights.zeroAmongZeros : weights.zeroAmongTimes;
@@ -55,55 +55,55 @@ int evidenceOfTimestamp(std::uint64_t timestamp, std::optional<std::uint64_t> ne
 
 } // namespace
 
-std::size_t sizeOf(Lead lead) {
-    switch (lead) {
-    case Lead::Nothing: return 0;
-    case Lead::Type:
-    case Lead::OtherType: return 1;
-    case Lead::CutPrefix: return LogMessage::prefixLength;
-    case Lead::Prefix: return LogMessage::prefixLength + 1;
+std::size_t sizeOf(Framing framing) {
+    switch (framing) {
+    case Framing::Nothing: return 0;
+    case Framing::Type:
+    case Framing::OtherType: return 1;
+    case Framing::PartialPrefix: return LogMessage::prefixLength;
+    case Framing::Prefix: return LogMessage::prefixLength + 1;
     }
     return 0;
 }
 
-std::optional<RecordCandidate> RecordCandidate::read(Bytes bytes, Lead lead,
+std::optional<RecordCandidate> RecordCandidate::read(Bytes bytes, Framing framing,
                                                      std::optional<std::uint64_t> nearby,
                                                      const RecordWeights& weights) {
-    const std::size_t leadSize = sizeOf(lead);
-    if (bytes.size() < leadSize + bareHeaderLength)
+    const std::size_t framingSize = sizeOf(framing);
+    if (bytes.size() < framingSize + bareHeaderLength)
         return std::nullopt;
-    const std::optional<int> leadEvidence = evidenceOfLead(bytes, lead, weights);
-    if (!leadEvidence)
+    const std::optional<int> framingScore = scoreOfFraming(bytes, framing, weights);
+    if (!framingScore)
         return std::nullopt;
-    const Record header(bytes.subspan(leadSize, bareHeaderLength));
+    const Record header(bytes.subspan(framingSize, bareHeaderLength));
     constexpr std::size_t typeSize = 1; // which LogMessage's offsets count and the bare header lacks
     RecordCandidate candidate;
-    candidate.lead = lead;
+    candidate.framing = framing;
     candidate.length = header.u16(LogMessage::lengthOffset - typeSize);
     if (candidate.length < bareHeaderLength)
         return std::nullopt;
-    candidate.size = leadSize + candidate.length;
+    candidate.size = framingSize + candidate.length;
     candidate.code = header.u16(LogMessage::codeOffset - typeSize);
     candidate.timestamp = header.u64(LogMessage::timestampOffset - typeSize);
-    candidate.evidence = *leadEvidence + evidenceOfTimestamp(candidate.timestamp, nearby, weights);
-    const bool isExtra = leadSize != 0 && bytes[leadSize - 1] == LogMessage::extraType;
+    candidate.score = *framingScore + timestampScore(candidate.timestamp, nearby, weights);
+    const bool isExtra = framingSize != 0 && bytes[framingSize - 1] == LogMessage::extraType;
     const std::uint32_t logCode = (isExtra ? LogMessage::firstExtraCode : 0) + candidate.code;
     if (candidate.isVersionReport())
-        candidate.evidence += weights.versionReport;
+        candidate.score += weights.versionReport;
     // Zeros that count as no time do not count as a code of the extra stream besides.
     else if (technologiesOfCode(logCode) != 0 && (candidate.code | candidate.timestamp) != 0)
-        candidate.evidence += weights.wantedCode;
+        candidate.score += weights.wantedCode;
     return candidate;
 }
 
 bool RecordCandidate::isVersionReport() const {
-    return lead == Lead::Nothing && code == dlfVersionReportCode && length == dlfVersionReportSize;
+    return framing == Framing::Nothing && code == dlfVersionReportCode && length == dlfVersionReportSize;
 }
 
 std::optional<std::uint8_t> RecordCandidate::missingByte() const {
-    switch (lead) {
-    case Lead::Nothing: return impliedType(code);
-    case Lead::CutPrefix: return LogMessage::prefixMarker;
+    switch (framing) {
+    case Framing::Nothing: return impliedType(code);
+    case Framing::PartialPrefix: return LogMessage::prefixMarker;
     default: return std::nullopt;
     }
 }

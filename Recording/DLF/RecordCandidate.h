@@ -13,40 +13,40 @@
 
 namespace velmora {
 
-/// What stands before a record's length field in raw material or a DLF log.
-enum class Lead : std::uint8_t {
-    Type,      ///< the type, of either stream
-    Prefix,    ///< a prefix and the type
-    Nothing,   ///< the type byte has been left out; DLF only
-    CutPrefix, ///< the prefix's second byte, and the type; DLF only
-    OtherType, ///< a type that is neither stream's
+/// The bytes before a record's length field in raw messages or a DLF log.
+enum class Framing : std::uint8_t {
+    Type,          ///< the type, of either stream
+    Prefix,        ///< a prefix and the type
+    Nothing,       ///< the type byte has been left out; DLF only
+    PartialPrefix, ///< the prefix's second byte, and the type; DLF only
+    OtherType,     ///< a type that is neither stream's
 };
 
-inline constexpr Lead everyLead[] = {Lead::Type, Lead::Prefix, Lead::Nothing, Lead::CutPrefix,
-                                     Lead::OtherType};
+inline constexpr Framing allFramings[] = {Framing::Type, Framing::Prefix, Framing::Nothing,
+                                          Framing::PartialPrefix, Framing::OtherType};
 
-/// Bytes that the lead takes.
-[[nodiscard]] std::size_t sizeOf(Lead lead);
+/// Bytes that the framing takes.
+[[nodiscard]] std::size_t sizeOf(Framing framing);
 
-/// A record that some bytes may be, and how much says that they are one.
+/// A possible record at some bytes, and how strong the evidence for it is.
 struct RecordCandidate {
     /// A record's header less its type byte: length, code, time stamp.
     static constexpr std::size_t bareHeaderLength = LogMessage::headerLength - 1;
 
-    Lead lead = Lead::Type;
-    std::size_t size = 0; ///< in the input, lead included
+    Framing framing = Framing::Type;
+    std::size_t size = 0; ///< in the input, framing included
     std::uint16_t length = 0;
     std::uint16_t code = 0;
     std::uint64_t timestamp = 0;
-    int evidence = 0; ///< from its own header, in bits (see RecordWeights)
-    int onward = 0;   ///< from what stands at its end; for RecordChain to fill in
+    int score = 0;         ///< from its own header, in bits (see RecordWeights)
+    int followerScore = 0; ///< from what follows it; set by RecordChain
 
-    /// The record that begins at the first byte with that lead; none where the bytes are too few for its
+    /// The record that begins at the first byte with that framing; none where the bytes are too few for its
     /// header or cannot be one. `nearby` is the time stamp of a record close to it.
     [[nodiscard]] static std::optional<RecordCandidate>
-    read(Bytes bytes, Lead lead, std::optional<std::uint64_t> nearby, const RecordWeights& weights);
+    read(Bytes bytes, Framing framing, std::optional<std::uint64_t> nearby, const RecordWeights& weights);
 
-    [[nodiscard]] int total() const { return evidence + onward; }
+    [[nodiscard]] int total() const { return score + followerScore; }
     [[nodiscard]] bool isVersionReport() const;
     /// The first byte of the message that is missing in the input; none where it is all there.
     [[nodiscard]] std::optional<std::uint8_t> missingByte() const;

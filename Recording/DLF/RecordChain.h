@@ -23,7 +23,7 @@ namespace velmora {
 /// length counts what follows the type. A DLF log has records without type byte; those in the middle of one
 /// of the application's buffers still have theirs, and their prefix; a prefixed record at a buffer's
 /// beginning has only the prefix's second byte and the type left. Nothing in the log says which of these a
-/// record is: the reading with the most evidence is taken (RecordCandidate), from its type byte, code and
+/// record is: the reading with the most score is taken (RecordCandidate), from its type byte, code and
 /// time stamp and from what follows where it ends. A type byte that is missing is restored from the code
 /// (impliedType).
 ///
@@ -32,12 +32,12 @@ namespace velmora {
 /// proportional to the input's size whatever it holds. Main thread only.
 class RecordChain {
 public:
-    enum class Layout : std::uint8_t { RawMaterial, DLF };
+    enum class Layout : std::uint8_t { RawMessages, DLF };
 
     struct Record {
         Data message;
-        std::uint64_t offset = 0;    ///< where in the input it begins
-        std::uint64_t timestamp = 0; ///< as it stands in the record (see RecordTime.h)
+        std::uint64_t offset = 0;    ///< its offset in the input
+        std::uint64_t timestamp = 0; ///< unchanged from the record (see RecordTime.h)
         bool isVersionReport = false;
     };
 
@@ -46,7 +46,7 @@ public:
 
     /// Whether the input begins as a DLF log's version report does, or with a record that no other input is
     /// likely to begin with. Call it before the first `next`.
-    [[nodiscard]] bool beginsSurely();
+    [[nodiscard]] bool looksLikeRecords();
     /// The next record; none at the end or once reading has failed.
     [[nodiscard]] std::optional<Record> next();
     /// What was skipped before the record, or the end, that `next` last returned; without its record number.
@@ -59,18 +59,18 @@ public:
 private:
     /// What the bytes at hand may be.
     struct Survey {
-        std::optional<RecordCandidate> linked; ///< ends where another record begins, or the input ends
-        std::optional<RecordCandidate> plain;  ///< has the evidence of a record itself
-        std::optional<RecordCandidate> cutOff; ///< likewise, but reaches past the end of the input
+        std::optional<RecordCandidate> linked;    ///< ends where another record begins, or the input ends
+        std::optional<RecordCandidate> plain;     ///< has the score of a record itself
+        std::optional<RecordCandidate> truncated; ///< likewise, but reaches past the end of the input
     };
 
-    [[nodiscard]] bool mayHave(Lead lead) const;
-    [[nodiscard]] std::optional<RecordCandidate> candidateAt(std::size_t at, Lead lead,
+    [[nodiscard]] bool allows(Framing framing) const;
+    [[nodiscard]] std::optional<RecordCandidate> candidateAt(std::size_t at, Framing framing,
                                                              std::optional<std::uint64_t> nearby);
-    [[nodiscard]] int evidenceAt(std::size_t at, std::optional<std::uint64_t> nearby);
-    [[nodiscard]] bool judge(std::size_t at, RecordCandidate& candidate);
-    [[nodiscard]] bool isSureAt(std::size_t at, int least);
-    [[nodiscard]] bool holdsBetter(const RecordCandidate& candidate);
+    [[nodiscard]] int scoreAt(std::size_t at, std::optional<std::uint64_t> nearby);
+    [[nodiscard]] bool scoreFollower(std::size_t at, RecordCandidate& candidate);
+    [[nodiscard]] bool isConvincingAt(std::size_t at, int least);
+    [[nodiscard]] bool containsBetterRecord(const RecordCandidate& candidate);
     [[nodiscard]] Survey survey();
     [[nodiscard]] Record take(const RecordCandidate& candidate);
     void skipDamage(const Survey& survey);

@@ -19,7 +19,7 @@ namespace velmora {
 
 namespace {
 
-/// Messages that each technology's decoder wants.
+/// Counts the messages whose code each technology's decoder subscribes to.
 class Votes {
 public:
     void add(Bytes message) {
@@ -90,7 +90,7 @@ std::optional<RecordChain::Record> RecordChainReader::nextRecord(RecordChain& ch
     }
 }
 
-void RecordChainReader::loseRecord(std::uint64_t bytes, std::string reason) {
+void RecordChainReader::addRecordLoss(std::uint64_t bytes, std::string reason) {
     addLoss({0, bytes, ++_number, std::move(reason), false});
 }
 

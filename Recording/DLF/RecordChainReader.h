@@ -16,9 +16,10 @@
 namespace velmora {
 
 /// The base of readers of files that hold bare log records and do not name their technology, which is derived
-/// from the log codes. Opening such a file looks ahead until one technology's decoder wants three messages
-/// more than any other's, over at most 1000 messages or 1 MiB of them, which are queued; the technology that
-/// wants most of them is it. With a tie, or no message that any wants, it stays unknown. Main thread only.
+/// from the log codes. Opening such a file looks ahead until one technology's decoder subscribes to three
+/// messages more than any other's, over at most 1000 messages or 1 MiB of them, which are queued; the
+/// technology with most of them is chosen. With a tie, or without such messages, it stays unknown. Main
+/// thread only.
 class RecordChainReader : public MessageReader {
 public:
     static constexpr std::size_t maximumLookAhead = 1000;
@@ -40,12 +41,12 @@ protected:
     [[nodiscard]] std::optional<RecordChain::Record> nextRecord(RecordChain& chain, std::string_view place);
     /// The number of the record that was returned last.
     [[nodiscard]] std::uint64_t number() const { return _number; }
-    /// Reports that the next record gives no message.
-    void loseRecord(std::uint64_t bytes, std::string reason);
+    /// Adds the loss of the next record.
+    void addRecordLoss(std::uint64_t bytes, std::string reason);
     /// Counts a record that is not part of a chain.
     void countRecord() { ++_number; }
-    /// The time that the record's stamp means; for a stamp of 0, and for one that means none, that of the
-    /// last record with a good one.
+    /// The time of the record's stamp; for a stamp of 0 or an invalid one, that of the last record with a
+    /// valid one.
     [[nodiscard]] Time timeOf(const RecordChain::Record& record);
 
 private:

@@ -11,13 +11,14 @@
 
 namespace velmora {
 
-/// Where a reader gets its bytes from: a file, a pipe, a test's memory. Read once, front to back. Main thread
+/// The source of a reader's bytes: a file, a pipe, a test's memory. Read once, sequentially. Main thread
 /// only.
 class ByteSource {
 public:
     virtual ~ByteSource() = default;
-    /// Puts the next bytes at the front of `buffer`, waiting until there is one at least. Gives their number,
-    /// which may be less than the buffer takes; 0 at the end alone. Precondition: the buffer is not empty.
+    /// Reads the next bytes into the start of `buffer`, blocking until there is at least one. Returns their
+    /// number, which may be less than the buffer's size; 0 only at the end. Precondition: the buffer is not
+    /// empty.
     virtual Result<std::size_t> read(std::span<std::uint8_t> buffer) = 0;
 };
 

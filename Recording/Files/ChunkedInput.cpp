@@ -25,7 +25,7 @@ bool ChunkedInput::fill(std::size_t count) {
         // that promise megabytes must not cost them.
         const std::size_t wanted = std::min(count, std::max(2 * (_end - _begin), _chunkSize));
         if (_chunk->size() - _begin < wanted || _chunk->size() - _end < smallestRead)
-            turnOver(wanted);
+            nextChunk(wanted);
         // Bytes after _end have never been handed out, so that they may be written in a chunk that is shared.
         const Result<std::size_t> got = _source->read(std::span(*_chunk).subspan(_end));
         if (!got) {
@@ -40,7 +40,7 @@ bool ChunkedInput::fill(std::size_t count) {
 }
 
 /// Moves the available bytes to the front of a chunk with room for `count`.
-void ChunkedInput::turnOver(std::size_t count) {
+void ChunkedInput::nextChunk(std::size_t count) {
     // A long look-ahead gets room to move on in, so that a row of them does not move its bytes once a step.
     const std::size_t size =
         count + smallestRead <= _chunkSize ? _chunkSize : std::bit_ceil(count + _chunkSize);

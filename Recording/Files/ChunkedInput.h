@@ -34,7 +34,7 @@ public:
     [[nodiscard]] bool ensure(std::size_t count) { return available().size() >= count || fill(count); }
     /// The bytes that have been read and not skipped. Valid until the next `ensure`.
     [[nodiscard]] Bytes available() const { return {_chunk->data() + _begin, _end - _begin}; }
-    /// Bytes skipped so far: where in the input the available ones begin.
+    /// Bytes skipped so far: the offset of the available ones in the input.
     [[nodiscard]] std::uint64_t offset() const { return _offset; }
     /// Precondition: `count` bytes are available.
     void skip(std::size_t count) {
@@ -52,12 +52,12 @@ private:
     using Chunk = std::shared_ptr<std::vector<std::uint8_t>>;
 
     bool fill(std::size_t count);
-    void turnOver(std::size_t count);
+    void nextChunk(std::size_t count);
 
     std::unique_ptr<ByteSource> _source;
     std::size_t _chunkSize;
     Chunk _chunk;
-    Chunk _spare; ///< the chunk before, for when it is given back before the present one
+    Chunk _spare; ///< the previous chunk, for reuse once it is unreferenced
     std::size_t _begin = 0;
     std::size_t _end = 0;
     std::uint64_t _offset = 0;

@@ -12,7 +12,7 @@
 
 namespace velmora {
 
-/// Bytes that are in memory already. Main thread only.
+/// Bytes in memory. Main thread only.
 class DataSource final : public ByteSource {
 public:
     explicit DataSource(Data data) : _rest(std::move(data)) {}

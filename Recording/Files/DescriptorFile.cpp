@@ -41,7 +41,7 @@ DescriptorFile::~DescriptorFile() {
     close();
 }
 
-RecordingFile::Written DescriptorFile::write(Bytes bytes) {
+OutputFile::Written DescriptorFile::write(Bytes bytes) {
     for (;;) {
         const ssize_t count = ::write(_descriptor, bytes.data(), bytes.size());
         if (count >= 0)
@@ -55,7 +55,7 @@ RecordingFile::Written DescriptorFile::write(Bytes bytes) {
     }
 }
 
-int DescriptorFile::cutTo(std::uint64_t size) {
+int DescriptorFile::truncateTo(std::uint64_t size) {
     const auto end = static_cast<off_t>(_start + size);
     return ::ftruncate(_descriptor, end) == 0 && ::lseek(_descriptor, end, SEEK_SET) == end ? 0 : errno;
 }
@@ -71,7 +71,7 @@ void DescriptorFile::startSync() {
     }
 }
 
-std::optional<int> DescriptorFile::takeSyncOutcome() {
+std::optional<int> DescriptorFile::takeSyncResult() {
     if (!_syncing.valid() || _syncing.wait_for(std::chrono::seconds(0)) != std::future_status::ready)
         return std::nullopt;
     return _syncing.get();
@@ -80,7 +80,7 @@ std::optional<int> DescriptorFile::takeSyncOutcome() {
 int DescriptorFile::sync() {
     const int earlier = _syncing.valid() ? _syncing.get() : 0;
     const int now = syncDescriptor(_descriptor);
-    // An error is told once, to whoever asks first.
+    // An error is returned once, to the first caller.
     return earlier != 0 ? earlier : now;
 }
 

@@ -3,17 +3,17 @@
 
 #pragma once
 
-#include "Recording/Files/RecordingFile.h"
+#include "Recording/Files/OutputFile.h"
 
 #include <future>
 
 namespace velmora {
 
-/// An open file descriptor that a recording is written to. The medium may take seconds to say that it has
-/// everything: `startSync` waits for it on a thread of its own, which does nothing else. Main thread only.
-class DescriptorFile final : public RecordingFile {
+/// An open file descriptor that a recording is written to. A sync to storage may take seconds: `startSync`
+/// waits for it on a separate thread, which does nothing else. Main thread only.
+class DescriptorFile final : public OutputFile {
 public:
-    /// Writes from where the descriptor stands. Closes it in the end when `owned`.
+    /// Writes at the descriptor's current position. Closes it on destruction when `owned`.
     DescriptorFile(int descriptor, bool owned);
     ~DescriptorFile() override;
     DescriptorFile(const DescriptorFile&) = delete;
@@ -21,9 +21,9 @@ public:
 
     Written write(Bytes bytes) override;
     [[nodiscard]] bool isRegular() const override { return _regular; }
-    int cutTo(std::uint64_t size) override;
+    int truncateTo(std::uint64_t size) override;
     void startSync() override;
-    std::optional<int> takeSyncOutcome() override;
+    std::optional<int> takeSyncResult() override;
     int sync() override;
     int close() override;
 
@@ -31,7 +31,7 @@ private:
     int _descriptor; ///< -1 when closed
     bool _owned;
     bool _regular = false;
-    std::uint64_t _start = 0; ///< where in a regular file the recording begins
+    std::uint64_t _start = 0; ///< offset of the recording in a regular file
     std::future<int> _syncing;
 };
 

@@ -34,7 +34,7 @@ Result<std::size_t> FileSource::read(std::span<std::uint8_t> buffer) {
         if (count >= 0)
             return static_cast<std::size_t>(count);
         if (errno == EAGAIN || errno == EWOULDBLOCK) {
-            // Standard input may have been left non-blocking by whoever shares it.
+            // Standard input may have been made non-blocking by another process that shares it.
             pollfd readable{_descriptor, POLLIN, 0};
             ::poll(&readable, 1, -1);
         } else if (errno != EINTR) {

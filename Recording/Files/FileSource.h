@@ -10,14 +10,14 @@
 
 namespace velmora {
 
-/// The bytes of an open file, pipe or terminal. Owns the descriptor unless told otherwise. Main thread only.
+/// The bytes of an open file, pipe or terminal. Owns the descriptor by default. Main thread only.
 class FileSource final : public ByteSource {
 public:
     /// Opens the file; "-" is standard input, which stays open afterwards. The reason does not repeat the
     /// path.
     static Result<std::unique_ptr<ByteSource>> open(const std::string& path);
 
-    /// Reads an open descriptor, and closes it in the end when `owned`.
+    /// Reads an open descriptor, and closes it on destruction when `owned`.
     FileSource(int descriptor, bool owned);
     ~FileSource() override;
     FileSource(const FileSource&) = delete;

@@ -3,8 +3,8 @@
 
 #include "Recording/Pcapng/BlockReader.h"
 
-#include "Recording/Files/InputBegin.h"
-#include "Recording/Pcapng/FieldReader.h"
+#include "Recording/Files/InputStart.h"
+#include "Recording/Pcapng/ByteReader.h"
 #include "Recording/Pcapng/Pcapng.h"
 
 #include <algorithm>
@@ -56,8 +56,8 @@ Result<Done> BlockReader::expectSection() {
     if (_input.failure())
         return *_input.failure();
     Block block;
-    if (!whole || FieldReader(begin, false).u32(0) != SectionHeader || examine(block) == Fault::NoByteOrder)
-        return Failure{unexpectedBegin(begin, "a pcapng section header")};
+    if (!whole || ByteReader(begin, false).u32(0) != SectionHeader || checkBlock(block) == Fault::NoByteOrder)
+        return Failure{unexpectedStart(begin, "a pcapng section header")};
     return Done{};
 }
 
@@ -66,37 +66,37 @@ const BlockReader::Block* BlockReader::next() {
     for (;;) {
         if (!_input.ensure(1))
             return nullptr;
-        const Fault fault = examine(_present);
+        const Fault fault = checkBlock(_present);
         if (fault == Fault::None) {
             _bigEndian = _present.bigEndian;
             return &_present;
         }
-        passDamage(fault, std::exchange(_present, Block()));
+        skipDamage(fault, std::exchange(_present, Block()));
     }
 }
 
-/// Looks at the block that the input stands at, reading as much of it as its length says.
-BlockReader::Fault BlockReader::examine(Block& block) {
+/// Checks the block at the input's position, and reads as much of it as its length says.
+BlockReader::Fault BlockReader::checkBlock(Block& block) {
     block.offset = _input.offset();
     block.length = 0;
     if (!_input.ensure(pcapng::blockOverhead))
-        return Fault::CutOff;
+        return Fault::Truncated;
     const Bytes header = _input.available();
     block.bigEndian = _bigEndian;
-    block.type = FieldReader(header, _bigEndian).u32(0);
+    block.type = ByteReader(header, _bigEndian).u32(0);
     if (block.type == SectionHeader) {
         const Bytes magic = header.subspan(magicOffset);
         block.bigEndian = startsWith(magic, bigEndianMagic);
         if (!block.bigEndian && !startsWith(magic, littleEndianMagic))
             return Fault::NoByteOrder;
     }
-    block.length = FieldReader(header, block.bigEndian).u32(4);
+    block.length = ByteReader(header, block.bigEndian).u32(4);
     if (block.length < pcapng::blockOverhead || block.length % 4 != 0 || block.length > maximumBlockSize)
         return Fault::Length;
     if (!_input.ensure(block.length))
-        return Fault::CutOff;
+        return Fault::Truncated;
     block.bytes = _input.available().first(block.length);
-    if (FieldReader(block.bytes, block.bigEndian).u32(block.length - 4) != block.length)
+    if (ByteReader(block.bytes, block.bigEndian).u32(block.length - 4) != block.length)
         return Fault::TrailingLength;
     return Fault::None;
 }
@@ -104,7 +104,7 @@ BlockReader::Fault BlockReader::examine(Block& block) {
 std::string BlockReader::describe(Fault fault, const Block& block) const {
     switch (fault) {
     case Fault::None: break;
-    case Fault::CutOff:
+    case Fault::Truncated:
         return std::string(block.length == 0 ? "block header" : "block") + " cut off after " +
                std::to_string(_input.available().size()) + " of " +
                std::to_string(block.length == 0 ? pcapng::blockOverhead : block.length) + " bytes";
@@ -114,14 +114,14 @@ std::string BlockReader::describe(Fault fault, const Block& block) const {
                std::to_string(pcapng::blockOverhead) + " to " + std::to_string(maximumBlockSize);
     case Fault::TrailingLength:
         return "trailing block length " +
-               std::to_string(FieldReader(block.bytes, block.bigEndian).u32(block.length - 4)) + ", wanted " +
+               std::to_string(ByteReader(block.bytes, block.bigEndian).u32(block.length - 4)) + ", wanted " +
                std::to_string(block.length);
     }
     return {};
 }
 
 /// Passes over a block that does not hold together, and all up to the next that does.
-void BlockReader::passDamage(Fault fault, const Block& block) {
+void BlockReader::skipDamage(Fault fault, const Block& block) {
     Loss loss;
     loss.offset = block.offset;
     loss.reason = describe(fault, block);
@@ -129,28 +129,28 @@ void BlockReader::passDamage(Fault fault, const Block& block) {
     for (unsigned phase = 1; !found && _input.ensure(1); phase = (phase + 1) % 4) {
         _input.skip(1);
         if (phase == 0 || startsWith(_input.available(), sectionHeaderWord))
-            found = standsAtBlock();
+            found = isAtBlock();
     }
     if (!found)
         _input.skip(_input.available().size());
     loss.bytes = _input.offset() - block.offset;
     // Where a whole block follows, it was the length that was damaged.
-    loss.isTail = !found && fault == Fault::CutOff && !_input.failure();
+    loss.isTruncation = !found && fault == Fault::Truncated && !_input.failure();
     _loss = std::move(loss);
 }
 
-bool BlockReader::standsAtBlock() {
+bool BlockReader::isAtBlock() {
     if (!_input.ensure(pcapng::blockOverhead))
         return false;
     const Bytes header = _input.available();
-    const std::uint32_t type = FieldReader(header, _bigEndian).u32(0);
+    const std::uint32_t type = ByteReader(header, _bigEndian).u32(0);
     Block block;
-    // The cheap tests come first: this is asked at every word of what may be a long stretch.
+    // The cheap tests come first: this is called for every word of what may be much input.
     if (leastLength(type) > maximumBlockSize)
         return false;
-    if (type != SectionHeader && FieldReader(header, _bigEndian).u32(4) < leastLength(type))
+    if (type != SectionHeader && ByteReader(header, _bigEndian).u32(4) < leastLength(type))
         return false;
-    return examine(block) == Fault::None && block.length >= leastLength(type);
+    return checkBlock(block) == Fault::None && block.length >= leastLength(type);
 }
 
 } // namespace velmora

@@ -23,14 +23,14 @@ public:
         std::uint32_t type = 0;
         std::uint32_t length = 0;
         bool bigEndian = false;   ///< the byte order of its section
-        std::uint64_t offset = 0; ///< where in the file it begins
+        std::uint64_t offset = 0; ///< its offset in the file
         Bytes bytes;              ///< all of it
 
-        /// What stands between its first length and its last.
+        /// The bytes between its first length and its last.
         [[nodiscard]] Bytes body() const;
     };
 
-    /// Blocks above this many bytes are taken for damage: the longest message, with a MiB for a block's
+    /// Blocks above this many bytes are treated as corrupt: the longest message, with a MiB for a block's
     /// options.
     static constexpr std::size_t maximumBlockSize = maximumMessageSize + (std::size_t{1} << 20);
 
@@ -43,7 +43,7 @@ public:
     /// What was skipped before the block, or the end, that `next` last returned; without its record number.
     [[nodiscard]] bool hasLoss() const { return _loss.has_value(); }
     [[nodiscard]] std::optional<Loss> takeLoss() { return std::exchange(_loss, std::nullopt); }
-    /// A shared window on the block that `next` last gave. Precondition: it lies inside the block.
+    /// A shared window on the block that `next` last returned. Precondition: it lies inside the block.
     [[nodiscard]] Data part(std::size_t offset, std::size_t length) const {
         return _input.part(offset, length);
     }
@@ -51,12 +51,12 @@ public:
     [[nodiscard]] const std::optional<Failure>& failure() const { return _input.failure(); }
 
 private:
-    enum class Fault : std::uint8_t { None, CutOff, NoByteOrder, Length, TrailingLength };
+    enum class Fault : std::uint8_t { None, Truncated, NoByteOrder, Length, TrailingLength };
 
-    [[nodiscard]] Fault examine(Block& block);
+    [[nodiscard]] Fault checkBlock(Block& block);
     [[nodiscard]] std::string describe(Fault fault, const Block& block) const;
-    void passDamage(Fault fault, const Block& block);
-    [[nodiscard]] bool standsAtBlock();
+    void skipDamage(Fault fault, const Block& block);
+    [[nodiscard]] bool isAtBlock();
 
     ChunkedInput _input;
     Block _present; ///< what `next` last gave

@@ -3,7 +3,7 @@
 
 #include "Recording/Pcapng/InterfaceDescription.h"
 
-#include "Recording/Pcapng/FieldReader.h"
+#include "Recording/Pcapng/ByteReader.h"
 #include "Recording/Pcapng/Pcapng.h"
 
 #include <algorithm>
@@ -37,7 +37,7 @@ Wide nanoseconds(std::uint64_t stamp, std::uint8_t resolution) {
 } // namespace
 
 std::optional<InterfaceDescription> InterfaceDescription::read(Bytes body, bool bigEndian) {
-    FieldReader fields(body, bigEndian);
+    ByteReader fields(body, bigEndian);
     InterfaceDescription description;
     description.linkType = fields.u16(0);
     description.snapLength = fields.u32(4);
@@ -52,7 +52,7 @@ std::optional<InterfaceDescription> InterfaceDescription::read(Bytes body, bool 
             return std::nullopt;
         if (option == pcapng::Option::InterfaceName) {
             const Bytes name = body.subspan(value, std::min(length, maximumName));
-            // Some writers end the text with a zero, which the format does not ask for.
+            // Some writers end the text with a zero, which the format does not require.
             description.name.assign(name.begin(), std::find(name.begin(), name.end(), std::uint8_t{0}));
         } else if (option == pcapng::Option::TimeResolution) {
             if (length != 1)

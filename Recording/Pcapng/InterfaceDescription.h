@@ -14,19 +14,20 @@
 
 namespace velmora {
 
-/// What a pcapng section says of one of its interfaces: what its packets are and how their time stamps count.
+/// A pcapng section's description of one of its interfaces: the type of its packets and the unit of their
+/// time stamps.
 struct InterfaceDescription {
     std::uint16_t linkType = 0;
     std::uint32_t snapLength = 0;    ///< bytes kept of a packet; 0 for no limit
-    std::string name;                ///< if_name, cut to 255 bytes; empty where there is none
+    std::string name;                ///< if_name, truncated to 255 bytes; empty where there is none
     std::uint8_t timeResolution = 6; ///< if_tsresol: negative power of ten, or of two with the top bit set
     std::int64_t timeOffset_seconds = 0; ///< if_tsoffset
 
     /// Reads the block's body; none where it is too short or an option does not fit.
     [[nodiscard]] static std::optional<InterfaceDescription> read(Bytes body, bool bigEndian);
 
-    /// The moment that a packet's time stamp means, to the nanosecond below; none where it lies outside of
-    /// what `Time` can hold (the years 1678 to 2262).
+    /// The time that a packet's time stamp denotes, rounded down to a nanosecond; none outside the range of
+    /// `Time` (the years 1678 to 2262).
     [[nodiscard]] std::optional<Time> time(std::uint64_t stamp) const {
         constexpr std::uint64_t latest = std::numeric_limits<std::int64_t>::max();
         // As recordings of ours are.

@@ -6,14 +6,14 @@
 #include <cstddef>
 #include <cstdint>
 
-/// The words of the pcapng capture file format that recordings are written in. Every block is a type, a total
-/// length, a body padded to 32 bits, and the total length again, all in the byte order of its section.
+/// Constants of the pcapng capture file format, in which recordings are written. Every block is a type, a
+/// total length, a body padded to 32 bits, and the total length again, all in the byte order of its section.
 namespace velmora::pcapng {
 
 namespace BlockType {
 inline constexpr std::uint32_t SectionHeader = 0x0A0D0D0A; ///< reads the same in both byte orders
 inline constexpr std::uint32_t InterfaceDescription = 1;
-inline constexpr std::uint32_t Packet = 2; ///< obsolete, still met in old captures
+inline constexpr std::uint32_t Packet = 2; ///< obsolete, found in old captures
 inline constexpr std::uint32_t SimplePacket = 3;
 inline constexpr std::uint32_t NameResolution = 4;
 inline constexpr std::uint32_t InterfaceStatistics = 5;

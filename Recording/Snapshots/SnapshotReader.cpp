@@ -45,7 +45,7 @@ Result<Data> serialized(const Value& value) {
     return Data(*std::move(binary));
 }
 
-Result<Value> readWhole(ChunkedInput& input) {
+Result<Value> readAll(ChunkedInput& input) {
     const PropertyListLimits limits;
     if (input.ensure(limits.maximumBytes + 1))
         return Failure{"property list of more than " + std::to_string(limits.maximumBytes) +
@@ -58,7 +58,7 @@ Result<Value> readWhole(ChunkedInput& input) {
 } // namespace
 
 Result<std::unique_ptr<SnapshotReader>> SnapshotReader::open(ChunkedInput input) {
-    const Result<Value> root = readWhole(input);
+    const Result<Value> root = readAll(input);
     if (!root)
         return Failure{root.reason()};
     const Dictionary* snapshot = root->asDictionary();
@@ -86,7 +86,7 @@ SnapshotReader::SnapshotReader(const Dictionary& snapshot)
         const Value* raw = fields ? fields->find("DisplayState") : nullptr;
         if (!raw)
             continue;
-        _hasRawMaterial = true;
+        _hasRawMessages = true;
         _isBinary = raw->asData() != nullptr;
         if (!_isBinary)
             setTechnology(shortTechnologyName(kVoxLogChannelTechnology_IFX));
@@ -107,12 +107,12 @@ std::optional<LoggedMessage> SnapshotReader::read() {
 void SnapshotReader::openEntry(const Value& entry) {
     const Dictionary* fields = entry.asDictionary();
     if (!fields) {
-        loseRecord(0, place() + "of kind " + std::string(nameOf(entry.kind())) + ", wanted dictionary");
+        addRecordLoss(0, place() + "of kind " + std::string(nameOf(entry.kind())) + ", wanted dictionary");
         return;
     }
     const Value& raw = (*fields)["DisplayState"];
     const Data* log = (*fields)["DLF"].asData();
-    _isLog = !_hasRawMaterial && log;
+    _isLog = !_hasRawMessages && log;
     if (_isLog) {
         openRecords(*log, RecordChain::Layout::DLF);
         return;
@@ -130,18 +130,18 @@ void SnapshotReader::openEntry(const Value& entry) {
         _begin = std::max(_begin, *earlier);
 
     if (const Data* bytes = raw.asData(); bytes && _isBinary) {
-        openRecords(*bytes, RecordChain::Layout::RawMaterial);
+        openRecords(*bytes, RecordChain::Layout::RawMessages);
     } else if (_isBinary || bytes) {
-        loseRecord(bytes ? bytes->size() : 0,
-                   place() + "raw material of kind " + std::string(nameOf(raw.kind())) + ", wanted " +
-                       (_isBinary ? "data" : "an object") + " as in the entries before");
+        addRecordLoss(bytes ? bytes->size() : 0,
+                      place() + "raw material of kind " + std::string(nameOf(raw.kind())) + ", wanted " +
+                          (_isBinary ? "data" : "an object") + " as in the entries before");
     } else {
         openObject(raw);
     }
 }
 
 void SnapshotReader::openRecords(const Data& bytes, RecordChain::Layout layout) {
-    constexpr std::size_t slack = 8192; // more than a chunk wants at its end
+    constexpr std::size_t slack = 8192; // more than a chunk needs at its end
     const std::size_t chunk = std::min(bytes.size() + slack, ChunkedInput::defaultChunkSize);
     _records.emplace(ChunkedInput(std::make_unique<DataSource>(bytes), chunk), layout);
     _size = bytes.size();
@@ -149,22 +149,22 @@ void SnapshotReader::openRecords(const Data& bytes, RecordChain::Layout layout) 
 
 void SnapshotReader::openObject(const Value& object) {
     if (!isDisplayTree(object)) {
-        loseRecord(0, place() + "object that holds other kinds than string, array and dictionary");
+        addRecordLoss(0, place() + "object that holds other kinds than string, array and dictionary");
         return;
     }
     Result<Data> message = serialized(object);
     if (!message) {
-        loseRecord(0, place() + message.reason());
+        addRecordLoss(0, place() + message.reason());
     } else if (message->size() > maximumMessageSize) {
-        loseRecord(message->size(), place() + "object of " + std::to_string(message->size()) +
-                                        " bytes, wanted at most " + std::to_string(maximumMessageSize));
+        addRecordLoss(message->size(), place() + "object of " + std::to_string(message->size()) +
+                                           " bytes, wanted at most " + std::to_string(maximumMessageSize));
     } else {
         countRecord();
         _pending = LoggedMessage{_begin, *std::move(message), number(), 0};
     }
 }
 
-/// The next message of the entry at hand; the last one waits until it is known to be that.
+/// The next message of the current entry; the last one waits until it is known to be that.
 std::optional<LoggedMessage> SnapshotReader::nextOfEntry() {
     while (_records) {
         std::optional<RecordChain::Record> record = nextRecord(*_records, place());
@@ -188,7 +188,7 @@ std::optional<LoggedMessage> SnapshotReader::nextOfEntry() {
     return std::exchange(_pending, std::nullopt);
 }
 
-/// What stands before the reason of a loss.
+/// The prefix of a loss's reason.
 std::string SnapshotReader::place() const {
     return "entry " + std::to_string(_nextEntry) + ": ";
 }

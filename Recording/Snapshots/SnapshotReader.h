@@ -17,29 +17,29 @@ namespace velmora {
 /// Reads a snapshot: a property list, XML or binary, that holds "Timestamp", "Data" and "Description"; "Data"
 /// is the history's entries, oldest first, and for the binary technologies a DLF log.
 ///
-/// An entry stands for one refresh. Its "DisplayState" is the raw material that the refresh had: of the
-/// binary technologies the messages as they arrived, one after the other; of the serialized-object
-/// technology the object of the last message before it, which is given as the one message of the entry,
-/// serialized anew. An entry without raw material is left out; where no entry has any, the messages are those
-/// of the DLF log, if there is one, with the times that DLFReader gives them.
+/// An entry is one refresh. Its "DisplayState" has the raw messages of the refresh: of the binary
+/// technologies the messages as they arrived, one after the other; of the serialized-object technology the
+/// object of the last message before it, which is serialized again and is the entry's one message. An entry
+/// without raw messages is skipped; if no entry has any, the messages are those of the DLF log, if there is
+/// one, with DLFReader's times.
 ///
-/// The last message of an entry carries the refresh, at the entry's "Date"; an entry without a readable one
-/// counts as 2 s later than the entry before, and the first one as of the snapshot's "Timestamp". An entry
-/// whose messages cannot be read, or that has none, has no refresh. The dates are whole seconds, and all that
-/// is known of the messages' times is that they came between two refreshes: they are spread over the 2 s
-/// before their own, or over what is left of these after the refresh before, in proportion to their places.
+/// The last message of an entry has the refresh, at the entry's "Date"; an entry without a readable date is 2
+/// s after the previous one, and the first one at the snapshot's "Timestamp". An entry whose messages cannot
+/// be read, or that has none, has no refresh. The dates have a resolution of a second, and the messages'
+/// times are only known to lie between two refreshes: they are distributed over the 2 s before their own, or
+/// over what is left of these after the previous refresh, in proportion to their offsets.
 ///
-/// A message's offset is its place in its entry's raw material, 0 for a serialized object; losses name the
-/// entry, counted from 1. Records are counted from 1 through all entries. The file is one property list and
-/// is held in memory: at most 256 MiB of it are taken. Main thread only.
+/// A message's offset is that in its entry's raw messages, 0 for a serialized object; losses name the entry,
+/// numbered from 1. Records are numbered from 1 through all entries. The file is one property list and is
+/// read into memory: at most 256 MiB. Main thread only.
 class SnapshotReader final : public RecordChainReader {
 public:
-    /// Opens an input of which nothing has been skipped, and reads it whole. Fails when it cannot be read, or
-    /// is no snapshot.
+    /// Opens an input of which nothing has been skipped, and reads all of it. Fails when it cannot be read,
+    /// or is no snapshot.
     static Result<std::unique_ptr<SnapshotReader>> open(ChunkedInput input);
 
     [[nodiscard]] std::string_view form() const override { return "snapshot"; }
-    /// None, ever: what cannot be read to its end is not opened.
+    /// Always none: an input that cannot be read to its end is not opened.
     [[nodiscard]] const std::optional<Failure>& failure() const override { return _failure; }
 
 protected:
@@ -56,15 +56,15 @@ private:
 
     ArrayRef _entries; ///< null where there are none
     Time _timestamp{};
-    bool _hasRawMaterial = false; ///< some entry has
-    bool _isBinary = false;       ///< the first entry with raw material has bytes
-    bool _isLog = false;          ///< the messages at hand are the DLF log's
+    bool _hasRawMessages = false; ///< some entry has
+    bool _isBinary = false;       ///< the first entry with raw messages has bytes
+    bool _isLog = false;          ///< the current messages are the DLF log's
     std::size_t _nextEntry = 0;
-    std::optional<RecordChain> _records;   ///< of the entry at hand
-    std::optional<LoggedMessage> _pending; ///< of the entry at hand: the last one, unless another follows
-    std::optional<Time> _refresh;          ///< of the entry at hand
-    Time _begin{};                         ///< from when on its messages are stamped
-    std::size_t _size = 0;                 ///< of its raw material
+    std::optional<RecordChain> _records;   ///< of the current entry
+    std::optional<LoggedMessage> _pending; ///< of the current entry: the last one, unless another follows
+    std::optional<Time> _refresh;          ///< of the current entry
+    Time _begin{};                         ///< start of its messages' times
+    std::size_t _size = 0;                 ///< of its raw messages
     std::optional<Failure> _failure;
 };
 

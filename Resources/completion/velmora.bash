@@ -37,7 +37,7 @@ _velmora() {
     _velmora_offer -h --help --version --sysroot --log-directory --start-service --self-test --log --log-level
 }
 
-# Completes a source: its kind, a scenario's name or a file, and then the options behind commas.
+# Completes a source: its kind, a scenario's name or a file, and then the options after commas.
 _velmora_source() {
     local source=$cur head=${cur%,*},
     case $source in

@@ -8,7 +8,7 @@
 
 namespace velmora {
 
-Time DriveScenario::beginning() {
+Time DriveScenario::startTime() {
     using namespace std::chrono;
     return sys_days{year{2026} / January / 5} + hours{8};
 }
@@ -36,7 +36,7 @@ void DriveScenario::advance() {
         send(at, step());
     }
     _now = end;
-    addDamage();
+    addUnusualMessage();
 }
 
 void DriveScenario::followTimeline() {
@@ -58,15 +58,15 @@ bool DriveScenario::timeToReselect(bool better, double after_s) {
     return better;
 }
 
-void DriveScenario::addDamage() {
-    if (_now < _nextDamage)
+void DriveScenario::addUnusualMessage() {
+    if (_now < _nextUnusual)
         return;
-    _nextDamage = _now + 5 + 10 * _random.unit();
-    const std::size_t number = _damage++;
-    const DamageMaterial material = damageMaterial(number);
+    _nextUnusual = _now + 5 + 10 * _random.unit();
+    const std::size_t number = _unusualCount++;
+    const UnusualMessageParts material = unusualMessageParts(number);
     const auto offset = offsetOf(_now);
-    if (const auto message =
-            damagedMessage(everyDamage[number % everyDamage.size()], material, beginning() + offset))
+    if (const auto message = unusualMessage(allUnusualMessages[number % allUnusualMessages.size()], material,
+                                            startTime() + offset))
         _events.push_back({offset, *message});
 }
 
@@ -74,7 +74,7 @@ void DriveScenario::send(double at, const std::optional<RecordBuilder>& record) 
     if (!record)
         return;
     const auto offset = offsetOf(at);
-    _events.push_back({offset, record->message(beginning() + offset)});
+    _events.push_back({offset, record->message(startTime() + offset)});
 }
 
 std::chrono::nanoseconds DriveScenario::offsetOf(double at) {

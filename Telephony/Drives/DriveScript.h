@@ -15,8 +15,8 @@ namespace velmora {
 /// send.
 using DriveStep = std::function<std::optional<RecordBuilder>()>;
 
-/// Steps by their time, in seconds from the scenario's start; those of one time in the order in which they
-/// were put there.
+/// Steps by their time, in seconds from the scenario's start; those of the same time in the order of
+/// insertion.
 using DriveScript = std::multimap<double, DriveStep>;
 
 } // namespace velmora

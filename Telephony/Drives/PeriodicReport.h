@@ -9,11 +9,11 @@
 
 namespace velmora {
 
-/// A record that the modem sends over and over; `Context` is what the technology's reports are made from.
+/// A record that the modem sends periodically; `Context` is what the technology's reports are made from.
 template <class Context>
 struct PeriodicReport {
     double period_s;
-    /// Nothing where the phone's state has nothing to report.
+    /// Returns nothing where the phone's state has nothing to report.
     std::optional<RecordBuilder> (*make)(Context&);
 };
 

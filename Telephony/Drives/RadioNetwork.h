@@ -16,7 +16,7 @@ struct PLMN {
     friend bool operator==(const PLMN&, const PLMN&) = default;
 };
 
-/// Where a cell belongs, whatever its radio technology.
+/// The areas of a cell of any radio technology.
 struct CellArea {
     PLMN plmn;
     int lac = 0;
@@ -51,8 +51,8 @@ struct UMTSMeasurement {
 
 /// Base stations along a ring road and a car that drives round it: twelve sites of three sectors, GSM 900 and
 /// UMTS on each and GSM 1800 on every third; two location areas of network 001/01 and one of 001/02. Levels
-/// come of transmit power, distance, sector pattern and slow fading, which changes as the car moves. Depends
-/// on nothing but the seed and the steps driven.
+/// follow from transmit power, distance, sector pattern and slow fading, which changes as the car moves.
+/// Depends only on the seed and the steps driven.
 class RadioNetwork {
 public:
     explicit RadioNetwork(std::uint64_t seed);
@@ -60,7 +60,7 @@ public:
     RadioNetwork(const RadioNetwork&) = delete;
     RadioNetwork& operator=(const RadioNetwork&) = delete;
 
-    /// Drives on for that long.
+    /// Drives on for that many seconds.
     void drive(double seconds);
 
     /// What the phone's receiver would measure now, the best first; only cells above its sensitivity.

@@ -22,7 +22,7 @@ public:
     /// A record of the telephony service's extra stream with this payload; `extraCode` is one of ExtraCode's.
     RecordBuilder(std::uint32_t extraCode, Bytes payload);
 
-    /// Each stores the low bits of the value and gives the builder back.
+    /// Each stores the low bits of the value and returns the builder.
     RecordBuilder& u8(std::size_t offset, std::int64_t value) { return store(offset, 1, value); }
     RecordBuilder& u16(std::size_t offset, std::int64_t value) { return store(offset, 2, value); }
     RecordBuilder& u32(std::size_t offset, std::int64_t value) { return store(offset, 4, value); }
@@ -31,7 +31,7 @@ public:
     /// bytes' other bits stay.
     RecordBuilder& bits(std::size_t byte, unsigned bit, unsigned width, std::int64_t value);
 
-    /// Cuts the record down to `length` bytes, header included; the header always stays whole.
+    /// Truncates the record to `length` bytes, header included; the header always stays complete.
     RecordBuilder& cutTo(std::size_t length);
 
     [[nodiscard]] std::size_t size() const { return _bytes.size(); }

@@ -16,12 +16,12 @@ struct ScenarioEvent {
     Data message;
 };
 
-/// A synthetic drive through a radio network: an endless list of messages that depends on nothing but the
-/// seed it was made with. Who plays it decides how fast.
+/// A synthetic drive through a radio network: an endless list of messages that depends only on its seed. Its
+/// player decides the speed.
 class Scenario {
 public:
     virtual ~Scenario() = default;
-    /// The constant of the log technology that it speaks.
+    /// The constant of its log technology.
     [[nodiscard]] virtual std::string_view technology() const = 0;
     /// The next message; offsets never go back.
     [[nodiscard]] virtual ScenarioEvent next() = 0;

@@ -8,9 +8,9 @@
 
 namespace velmora {
 
-/// The dice of a scenario: the same seed throws the same numbers on every machine. The engine is the standard
-/// one, whose numbers are fixed; the distributions are our own, since the standard library's differ from one
-/// implementation to the next.
+/// A scenario's pseudo-random numbers: the same seed gives the same numbers on every machine. The engine is
+/// the standard one, whose numbers are fixed; the distributions are our own, since the standard library's
+/// differ from one implementation to the next.
 class ScenarioRandom {
 public:
     explicit ScenarioRandom(std::uint64_t seed) : _engine(seed) {}
@@ -25,8 +25,8 @@ public:
 
     [[nodiscard]] bool chance(double probability) { return unit() < probability; }
 
-    /// Near enough a normal distribution of mean 0 and deviation 1, within -6..6: twelve throws added, which
-    /// needs no function that libraries round differently.
+    /// Near enough a normal distribution of mean 0 and deviation 1, within -6..6: the sum of twelve uniform
+    /// numbers, which needs no function that libraries round differently.
     [[nodiscard]] double normal() {
         double sum = -6;
         for (int i = 0; i < 12; ++i)

@@ -22,7 +22,7 @@ constexpr ScenarioKind kinds[] = {
     {"c2k", "a drive through CDMA2000 1x and EV-DO (Ostrel CDMA)", make<C2KScenario>},
     {"lte", "a drive through LTE (Ostrel LTE)", make<LTEScenario>},
     {"utran", "a drive through TD-SCDMA (Ostrel UTRAN2)", make<UTRANScenario>},
-    {"ifx", "a drive through GSM told as property lists (IFX)", make<IFXScenario>},
+    {"ifx", "a drive through GSM, as property lists (IFX)", make<IFXScenario>},
 };
 
 } // namespace

@@ -13,10 +13,10 @@
 
 namespace velmora {
 
-/// A scenario that there is: one line in the registry's list.
+/// An entry of the registry's list.
 struct ScenarioKind {
     std::string_view name;
-    std::string_view description; ///< what `--help` says of it
+    std::string_view description; ///< its text in `--help`
     std::unique_ptr<Scenario> (*make)(std::uint64_t seed);
 };
 

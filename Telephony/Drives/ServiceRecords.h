@@ -13,7 +13,7 @@
 
 /// The records of the telephony service's extra stream, one function a code. They are the same in every
 /// technology. The payload is a property list, in the binary form where `binary` says so and in XML
-/// otherwise; what it holds is made here, so that writing it cannot fail for reasons of the input.
+/// otherwise; its content is made here, so that writing it cannot fail because of the input.
 namespace velmora::records {
 
 /// ExtraCode::simFiles: the SIM's files, display-ready strings under the keys "kSimFile_...".

@@ -8,10 +8,11 @@
 
 namespace velmora {
 
-/// What the serving cell measures in this list of the receiver's; the cell at the receiver's limit where it
-/// is not in it.
+/// The serving cell's entry in this list of measurements; the cell at the receiver's sensitivity where it is
+/// not in the list.
 template <class Measurement>
-[[nodiscard]] Measurement measuredAnew(const Measurement& serving, const std::vector<Measurement>& list) {
+[[nodiscard]] Measurement updatedMeasurement(const Measurement& serving,
+                                             const std::vector<Measurement>& list) {
     const auto found = std::find_if(list.begin(), list.end(),
                                     [&](const Measurement& each) { return each.cell == serving.cell; });
     if (found != list.end())

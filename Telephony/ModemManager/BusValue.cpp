@@ -160,7 +160,7 @@ Value busValue(const QVariant& content) {
     return Reader().read(content, 0);
 }
 
-std::string quotable(std::string_view text) {
+std::string printableForLog(std::string_view text) {
     std::string quoted;
     std::size_t offset = 0;
     while (offset < text.size() && quoted.size() < longestQuote) {

@@ -7,17 +7,17 @@
 
 namespace velmora {
 
-void FaultLog::tell(std::string_view subject, const std::string& text) {
-    std::string& told = _told[std::string(subject)];
-    if (told == text)
+void FaultLog::report(std::string_view subject, const std::string& text) {
+    std::string& last = _reported[std::string(subject)];
+    if (last == text)
         return;
-    told = text;
+    last = text;
     logFormat(LogPriority::Warning, "modemmanager: %s", text.c_str());
 }
 
-void FaultLog::over(std::string_view subject) {
-    if (const auto told = _told.find(subject); told != _told.end())
-        _told.erase(told);
+void FaultLog::clear(std::string_view subject) {
+    if (const auto last = _reported.find(subject); last != _reported.end())
+        _reported.erase(last);
 }
 
 } // namespace velmora

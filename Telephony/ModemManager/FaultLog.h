@@ -10,17 +10,17 @@
 
 namespace velmora {
 
-/// Tells of what does not work once and not at every try: a line a subject, at warning priority, and another
-/// only when the words have changed or the fault has been over in between. Main thread only.
+/// Logs a recurring fault once and not at every retry: a line per subject, at warning priority, and another
+/// only when the text has changed or the fault was cleared in between. Main thread only.
 class FaultLog {
 public:
     /// Precondition: the subject is one of few; it is not shown.
-    void tell(std::string_view subject, const std::string& text);
-    /// The subject works: the next fault of it is told again.
-    void over(std::string_view subject);
+    void report(std::string_view subject, const std::string& text);
+    /// Clears the subject's fault: its next fault is logged again.
+    void clear(std::string_view subject);
 
 private:
-    std::map<std::string, std::string, std::less<>> _told; ///< the last text by subject
+    std::map<std::string, std::string, std::less<>> _reported; ///< the last text by subject
 };
 
 } // namespace velmora

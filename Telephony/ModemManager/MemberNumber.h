@@ -9,12 +9,12 @@
 #include <optional>
 #include <string_view>
 
-/// How a member of ModemManager's becomes a number of the cell information array. Each function gives none
-/// for a member that is missing, of another type than ModemManager documents, or beyond what the thing
-/// measured can be: such a member is left out.
+/// How a member of ModemManager's becomes a number of the cell information array. Each function returns none
+/// for a member that is missing, of another type than ModemManager documents, or out of its physical range:
+/// such a member is omitted.
 namespace velmora::convert {
 
-/// An unsigned number of at most `maximum`, as it stands.
+/// An unsigned number of at most `maximum`, unchanged.
 template <std::int64_t maximum>
 [[nodiscard]] Value number(const Value& member) {
     const std::int64_t* number = member.asInteger();
@@ -37,7 +37,7 @@ template <int lowest, int highest>
     return wholeLevel(member, lowest, highest);
 }
 
-/// The half-steps in which the service gives GSM levels: a number of 2 dBm, the lower where two are as near.
+/// GSM levels in the service's steps of 2 dBm; of two equally near steps the lower.
 [[nodiscard]] Value halfSteps(const Value& dBm);
 /// The same of an RXLEV from 0 to 63, which counts decibels up from -111 dBm.
 [[nodiscard]] Value halfStepsOfRXLEV(const Value& member);
@@ -48,11 +48,11 @@ template <int lowest, int highest>
 /// A decimal text of at most three digits, as a number.
 [[nodiscard]] Value decimalCode(const Value& member);
 
-/// What the conversions are made of.
+/// Helpers of the conversions.
 [[nodiscard]] bool allDigits(std::string_view text);
 /// "MCCMNC" where the member is that; empty where it is not.
 [[nodiscard]] std::string_view networkOf(const Value& member);
-/// The member where it is a number from `lowest` to `highest`; what is no number lies nowhere.
+/// The member where it is a number from `lowest` to `highest`.
 [[nodiscard]] std::optional<double> within(const Value& member, double lowest, double highest);
 
 } // namespace velmora::convert

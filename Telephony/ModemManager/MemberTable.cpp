@@ -51,13 +51,13 @@ constexpr MemberRow serves(Of of, std::string_view member, std::string_view note
 
 /// A member that is left unused.
 constexpr MemberRow unused(Of of, std::string_view member, std::string_view why) {
-    return {of, member, Nothing, {}, nullptr, why};
+    return {of, member, Unused, {}, nullptr, why};
 }
 
 // clang-format off
 constexpr MemberRow table[] = {
-    // Where it stands, the member; then where it is used, under which key, by which conversion, and both sides' units and
-    // encodings; or what it serves for; or why it is unused.
+    // Its interface or dictionary and its name; then its use, the key that it sets, the conversion, and both sides' units
+    // and encodings; or what the service uses it for; or why it is unused.
 
     // Cells of Modem.GetCellInfo. Identities are hexadecimal text there and numbers here.
     serves(Of::AnyCell,          "cell-type",           "number; chooses the rows, and the radio access technology"),
@@ -95,16 +95,16 @@ constexpr MemberRow table[] = {
     unused(Of::OtherCell,        "*",                   "CDMA, TD-SCDMA and 5G NR cells are of technologies that the live display does not have"),
 
     // Modem.Location.GetLocation, source 3GPP_LAC_CI: the serving cell where GetCellInfo names none.
-    sets  (Of::CSPlace,          "mcc",                 Cell,        mccKey,                      decimalCode,         "decimal text"),
-    sets  (Of::CSPlace,          "mnc",                 Cell,        mncKey,                      decimalCode,         "decimal text"),
-    sets  (Of::CSPlace,          "lac",                 Cell,        lacKey,                      areaCode,            "hexadecimal text, 16 bits"),
-    sets  (Of::CSPlace,          "ci",                  Cell,        cellIdKey,                   longCellId,          "hexadecimal text, 28 bits"),
-    unused(Of::CSPlace,          "tac",                 "GSM and UMTS have no tracking areas"),
-    sets  (Of::EPSPlace,         "mcc",                 Cell,        mccKey,                      decimalCode,         "decimal text"),
-    sets  (Of::EPSPlace,         "mnc",                 Cell,        mncKey,                      decimalCode,         "decimal text"),
-    sets  (Of::EPSPlace,         "tac",                 Cell,        tacKey,                      trackingAreaCode,    "hexadecimal text, 24 bits"),
-    sets  (Of::EPSPlace,         "ci",                  Cell,        cellIdKey,                   longCellId,          "hexadecimal text, 28 bits"),
-    unused(Of::EPSPlace,         "lac",                 "it is that of the fallback for calls, not of the LTE cell"),
+    sets  (Of::CSLocation,       "mcc",                 Cell,        mccKey,                      decimalCode,         "decimal text"),
+    sets  (Of::CSLocation,       "mnc",                 Cell,        mncKey,                      decimalCode,         "decimal text"),
+    sets  (Of::CSLocation,       "lac",                 Cell,        lacKey,                      areaCode,            "hexadecimal text, 16 bits"),
+    sets  (Of::CSLocation,       "ci",                  Cell,        cellIdKey,                   longCellId,          "hexadecimal text, 28 bits"),
+    unused(Of::CSLocation,       "tac",                 "GSM and UMTS have no tracking areas"),
+    sets  (Of::EPSLocation,      "mcc",                 Cell,        mccKey,                      decimalCode,         "decimal text"),
+    sets  (Of::EPSLocation,      "mnc",                 Cell,        mncKey,                      decimalCode,         "decimal text"),
+    sets  (Of::EPSLocation,      "tac",                 Cell,        tacKey,                      trackingAreaCode,    "hexadecimal text, 24 bits"),
+    sets  (Of::EPSLocation,      "ci",                  Cell,        cellIdKey,                   longCellId,          "hexadecimal text, 28 bits"),
+    unused(Of::EPSLocation,      "lac",                 "it is that of the fallback for calls, not of the LTE cell"),
     unused(Of::Location,         "Capabilities",        "the answer itself tells whether there is a place"),
     unused(Of::Location,         "Enabled",             "the answer itself tells; sources that are off stay so, satellites above all"),
     unused(Of::Location,         "Location",            "empty unless signalled to everybody; GetLocation is asked"),

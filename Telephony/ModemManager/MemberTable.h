@@ -11,21 +11,21 @@
 
 namespace velmora {
 
-/// Where a member of ModemManager's stands.
+/// The interface or dictionary of a member of ModemManager's.
 enum class MemberOf : std::uint8_t {
-    AnyCell,    ///< a cell of GetCellInfo, of any type
-    GSMCell,    ///< one of type GSM
-    UMTSCell,   ///< UMTS
-    LTECell,    ///< LTE
-    OtherCell,  ///< CDMA, TD-SCDMA or 5G NR
-    CSPlace,    ///< a part of GetLocation's text "MCC,MNC,LAC,CI,TAC", while registered on GSM or UMTS
-    EPSPlace,   ///< the same while registered on LTE
-    GSMSignal,  ///< the dictionary Modem.Signal.Gsm, and so on
-    UMTSSignal, ///<
-    LTESignal,  ///<
-    NRSignal,   ///<
-    CDMASignal, ///< Cdma and Evdo
-    Modem,      ///< the interface Modem
+    AnyCell,     ///< a cell of GetCellInfo, of any type
+    GSMCell,     ///< one of type GSM
+    UMTSCell,    ///< UMTS
+    LTECell,     ///< LTE
+    OtherCell,   ///< CDMA, TD-SCDMA or 5G NR
+    CSLocation,  ///< a part of GetLocation's text "MCC,MNC,LAC,CI,TAC", while registered on GSM or UMTS
+    EPSLocation, ///< the same while registered on LTE
+    GSMSignal,   ///< the dictionary Modem.Signal.Gsm, and so on
+    UMTSSignal,  ///<
+    LTESignal,   ///<
+    NRSignal,    ///<
+    CDMASignal,  ///< Cdma and Evdo
+    Modem,       ///< the interface Modem
     Modem3gpp,
     Location, ///< Modem.Location
     Signal,   ///< Modem.Signal, but for its dictionaries
@@ -45,7 +45,7 @@ enum class MemberUse : std::uint8_t {
     Bearer,      ///< a bearer's dictionary of display values among the packet-data contexts
     Link,        ///< every bearer's dictionary: the radio link that carries it
     Service,     ///< no record: the service itself uses it
-    Nothing,     ///< it is left unused
+    Unused,
 };
 
 /// A row of the table of what ModemManager's members become.
@@ -55,7 +55,7 @@ struct MemberRow {
     MemberUse use;
     std::string_view key;           ///< the key that it sets, where a record has it
     Value (*convert)(const Value&); ///< none for what cannot be; null where no record has it
-    std::string_view note;          ///< the units and encodings, or what it serves, or why it is unused
+    std::string_view note;          ///< the units and encodings, or its use, or why it is unused
 };
 
 /// The whole table.

@@ -19,7 +19,7 @@ namespace {
 
 constexpr std::size_t longestText = 128;
 constexpr std::size_t longestList = 100;
-/// What is above this in seconds is no date that anybody means.
+/// A value above this in seconds is no plausible date.
 constexpr std::int64_t lastDate = 9'000'000'000;
 
 /// A number's text in an enumeration or a mask.

@@ -6,8 +6,8 @@
 #include "PropertyLists/Value.h"
 
 /// How a member of ModemManager's becomes text for people: SIM files and the values of a bearer. As with the
-/// numbers, each function gives none for a member that is missing, of another type than ModemManager
-/// documents, or beyond what it can be.
+/// numbers, each function returns none for a member that is missing, of another type than ModemManager
+/// documents, or out of range.
 namespace velmora::convert {
 
 /// "MCCMNC" as "MCC-MNC".

@@ -16,7 +16,7 @@ constexpr std::string_view presence = "presence"; ///< of bus, ModemManager and 
 
 std::string textOf(const Modem& modem, std::string_view property) {
     const std::string* text = modem[mm::modem][property].asString();
-    return text && !text->empty() ? ' ' + quotable(*text) : std::string();
+    return text && !text->empty() ? ' ' + printableForLog(*text) : std::string();
 }
 
 std::string absence(const BusReply& reply) {
@@ -31,14 +31,14 @@ std::string absence(const BusReply& reply) {
 
 ModemFollower::ModemFollower(MainQueue& queue, Options options, Observer& observer)
     : _queue(queue), _options(std::move(options)), _observer(observer), _bus(_options.busAddress, *this) {
-    // Started by hand, this may be the one who wants ModemManager to run; later it may have been stopped for
-    // a reason.
+    // At the start ModemManager may be activated, since this service may be its first user; later it may have
+    // been stopped on purpose, and is not.
     open(true);
 }
 
 void ModemFollower::open(bool startsService) {
     if (const auto opened = _bus.open(); !opened) {
-        _faults.tell(presence, "no system bus (" + opened.reason() + ')');
+        _faults.report(presence, "no system bus (" + opened.reason() + ')');
         retryLater();
         return;
     }
@@ -53,7 +53,7 @@ void ModemFollower::list(bool startsService) {
                .startsService = startsService},
               [this](const BusReply& reply) {
                   if (reply.failed()) {
-                      _faults.tell(presence, absence(reply));
+                      _faults.report(presence, absence(reply));
                       retryLater();
                       return;
                   }
@@ -82,14 +82,14 @@ void ModemFollower::serviceAppeared() {
 }
 
 void ModemFollower::serviceVanished() {
-    _faults.tell(presence, "ModemManager has gone");
+    _faults.report(presence, "ModemManager has gone");
     forgetModems();
     retryLater();
 }
 
 void ModemFollower::busLost() {
-    _faults.tell(presence, "the system bus has gone");
-    // Not at once: this comes from the bus itself.
+    _faults.report(presence, "the system bus has gone");
+    // Deferred: this is called by the bus itself.
     _queue.async([this, weak = std::weak_ptr<bool>(_alive)] {
         if (weak.expired())
             return;
@@ -125,12 +125,12 @@ void ModemFollower::choose() {
     const Modem* modem = _objects.choose(_options.modem, _chosen);
     const std::string path = modem ? modem->path : std::string();
     if (modem)
-        _faults.over(presence);
+        _faults.clear(presence);
     else if (_options.modem && !_objects.indices().empty())
-        _faults.tell(presence, "no modem " + std::to_string(*_options.modem) +
-                                   " is there, only: " + _objects.indices());
+        _faults.report(presence, "no modem " + std::to_string(*_options.modem) +
+                                     " is there, only: " + _objects.indices());
     else
-        _faults.tell(presence, "no modem is there");
+        _faults.report(presence, "no modem is there");
     if (path == _chosen)
         return _observer.modemChanged();
     _chosen = path;

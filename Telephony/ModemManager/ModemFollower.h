@@ -16,19 +16,18 @@
 
 namespace velmora {
 
-/// Knows at any time which modem there is and what ModemManager says of it. It listens and asks the modem for
-/// nothing: ModemManager tells from what it knows already. Where there is no bus, no ModemManager or no modem
-/// it says so once and goes on looking. Main thread only.
+/// Tracks the modem and its properties as ModemManager publishes them, without querying the modem itself. A
+/// missing bus, ModemManager or modem is logged once and retried. Main thread only.
 class ModemFollower final : private ModemManagerBus::Observer {
 public:
     class Observer {
     public:
         virtual ~Observer() = default;
-        /// The followed modem is another one now, or there is none any more.
+        /// The followed modem has changed, or there is none any more.
         virtual void modemChosen() = 0;
         /// Something of the followed modem has changed, its interfaces included.
         virtual void modemChanged() = 0;
-        /// Properties of an object that is no modem have changed; the arguments are those of the signal.
+        /// Properties of another object have changed; the arguments are those of the signal.
         virtual void objectChanged(const std::string& path, const Array& arguments) = 0;
     };
 
@@ -37,7 +36,7 @@ public:
         std::string busAddress;             ///< the system bus where it is empty
     };
 
-    /// How long after a failure the bus and ModemManager are tried again.
+    /// The delay before the bus and ModemManager are retried after a failure.
     static constexpr std::chrono::seconds retryInterval{10};
 
     /// Begins at once. Queue and observer must outlive it.
@@ -69,9 +68,9 @@ private:
     ModemManagerBus _bus;
     ModemObjects _objects;
     std::string _chosen;  ///< the path of the followed modem; empty while there is none
-    bool _listed = false; ///< the modems that there are have been told
+    bool _listed = false; ///< the existing modems have been listed
     bool _retrying = false;
-    /// Tasks on the queue hold it weakly: they do nothing once this is gone.
+    /// Queued tasks hold it weakly: they do nothing after the object's destruction.
     std::shared_ptr<bool> _alive = std::make_shared<bool>(true);
 };
 

@@ -34,8 +34,8 @@ QDBusMessage messageOf(const BusCall& call) {
 BusReply replyOf(const QDBusMessage& message) {
     BusReply reply;
     if (message.type() == QDBusMessage::ErrorMessage) {
-        reply.error = quotable(message.errorName().toStdString());
-        reply.text = quotable(message.errorMessage().toStdString());
+        reply.error = printableForLog(message.errorName().toStdString());
+        reply.text = printableForLog(message.errorMessage().toStdString());
         if (reply.error.empty())
             reply.error = "an error without a name";
     } else if (!message.arguments().isEmpty()) {
@@ -160,7 +160,7 @@ Result<Done> ModemManagerBus::open() {
     auto bus = _address.empty() ? QDBusConnection::connectToBus(QDBusConnection::SystemBus, name)
                                 : QDBusConnection::connectToBus(QString::fromStdString(_address), name);
     if (!bus.isConnected()) {
-        const std::string reason = quotable(bus.lastError().message().toStdString());
+        const std::string reason = printableForLog(bus.lastError().message().toStdString());
         bus = QDBusConnection(QString());
         QDBusConnection::disconnectFromBus(name);
         return Failure{reason};

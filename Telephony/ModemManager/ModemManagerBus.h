@@ -26,7 +26,7 @@ struct BusCall {
     bool startsService = false;                ///< the bus may start ModemManager for it
 };
 
-/// What a call ends with: its first result, or the name and the words of an error.
+/// The result of a call: its first return value, or the name and text of an error.
 struct BusReply {
     Value value;       ///< none where the method has no result, and on an error
     std::string error; ///< as the bus names it; empty where there is none
@@ -35,17 +35,16 @@ struct BusReply {
     [[nodiscard]] bool failed() const { return !error.empty(); }
     /// The modem or ModemManager cannot do it.
     [[nodiscard]] bool isUnsupported() const;
-    /// The bus or ModemManager does not let us.
+    /// The bus or ModemManager denies access.
     [[nodiscard]] bool isDenied() const;
-    /// Nobody is there to answer.
+    /// The service does not exist.
     [[nodiscard]] bool isAbsent() const;
     /// The error as a log line ends in it: "NAME: WORDS".
     [[nodiscard]] std::string reason() const;
 };
 
-/// A connection to the bus that ModemManager lives on. Whoever holds it owns it; nothing is called back after
-/// it was closed or destroyed, and nothing from inside its own functions. Nothing waits for ModemManager.
-/// Main thread only, on Qt's event loop.
+/// A connection to the bus that ModemManager lives on. No callback runs after it was closed or destroyed, or
+/// inside its own functions. No call blocks on ModemManager. Main thread only, on Qt's event loop.
 class ModemManagerBus {
 public:
     class Observer {
@@ -53,9 +52,9 @@ public:
         virtual ~Observer() = default;
         /// ModemManager has come to the bus. Not called for one that was there when the bus was opened.
         virtual void serviceAppeared() = 0;
-        /// It has left the bus. Calls that were on their way are not answered any more.
+        /// It has left the bus. Pending calls are not answered any more.
         virtual void serviceVanished() = 0;
-        /// The connection to the bus has ended; nothing more comes until it is opened again.
+        /// The connection to the bus has ended; no further callbacks until it is opened again.
         virtual void busLost() = 0;
         /// ModemManager sent one of its objects' signals.
         virtual void signalArrived(const std::string& path, std::string_view member,
@@ -76,10 +75,10 @@ public:
     void close();
 
     using Answered = std::function<void(const BusReply&)>;
-    /// Calls and comes back at once; `answered` follows, unless the service vanishes or the bus is closed
-    /// before. Does nothing on a closed bus.
+    /// Calls asynchronously; `answered` runs later, unless the service vanishes or the bus is closed before.
+    /// Does nothing on a closed bus.
     void call(const BusCall& call, Answered answered);
-    /// Calls without caring for the answer. What was sent before the bus is closed still goes out.
+    /// Calls and ignores the answer. Calls sent before the bus is closed are still delivered.
     void send(const BusCall& call);
 
 private:

@@ -15,7 +15,7 @@ inline constexpr std::string_view rootPath = "/org/freedesktop/ModemManager1";
 /// What the paths of modems begin with; a number without leading zeros follows.
 inline constexpr std::string_view modemPathPrefix = "/org/freedesktop/ModemManager1/Modem/";
 /// Whether a text is the path of an object: parts of letters, digits and underscores, each after a slash. A
-/// slash alone stands where a path is wanted and there is no object.
+/// single slash is the path of no object.
 [[nodiscard]] constexpr bool isObject(std::string_view path) {
     if (!path.starts_with('/') || path.ends_with('/') || path.find("//") != path.npos)
         return false;

@@ -45,14 +45,14 @@ void ModemManagerSource::beginSession() {
 
 void ModemManagerSource::send(const RecordBuilder& record) {
     if (_sink)
-        _sink->take(record.message(_clock.now()));
+        _sink->receive(record.message(_clock.now()));
 }
 
 void ModemManagerSource::modemChosen() {
     const bool hadModem = std::exchange(_session, nullptr) != nullptr;
     if (hadModem) {
-        // What the modem that has gone measured is not to stay on the screen. Its SIM's files do: the display
-        // takes none of them away.
+        // A removed modem's measurements must not stay on the screen. Its SIM's files do, since the display
+        // never removes any.
         send(records::cellInformation({}, binary));
         send(records::packetContexts({}, binary));
     }

@@ -16,17 +16,17 @@
 
 namespace velmora {
 
-/// The modem that ModemManager looks after, live: the service's extra stream with its cells, its SIM and its
+/// The modem that ModemManager manages, live: the service's extra stream with its cells, its SIM and its
 /// bearers. Its technology follows the access technology of the modem; it is empty until a modem is known,
-/// and stays what it was while the modem is on no network or gone. The modem is asked only between `start`
-/// and `stop`. Main thread only.
+/// and stays what it was while the modem is on no network or has been removed. The modem is queried only
+/// between `start` and `stop`. Main thread only.
 class ModemManagerSource final : public LogSource, private ModemFollower::Observer {
 public:
     /// Looks for modems from now on. Queue and clock must outlive the source.
     ModemManagerSource(MainQueue& queue, const Clock& clock, ModemFollower::Options options);
 
     [[nodiscard]] std::string_view technology() const override { return _technology; }
-    void whenTechnologyChanges(std::function<void()> changed) override { _changed = std::move(changed); }
+    void setTechnologyCallback(std::function<void()> changed) override { _changed = std::move(changed); }
     void start(LogSink& sink) override;
     void stop() override;
 

@@ -25,14 +25,14 @@ struct Modem {
     [[nodiscard]] bool hasSIM() const;
 };
 
-/// The modems that ModemManager's object manager lists, kept up to date by its signals. What is not a modem,
-/// or not what the object manager is to say, is left out. Main thread only.
+/// The modems that ModemManager's object manager lists, kept up to date by its signals. Other objects and
+/// malformed signals are ignored. Main thread only.
 class ModemObjects {
 public:
     static constexpr std::size_t maximumModems = 32;
 
     void clear() { _modems.clear(); }
-    /// The answer of GetManagedObjects in place of all that was known.
+    /// Replaces all modems by the answer of GetManagedObjects.
     void reset(const Value& objects);
     /// The arguments of InterfacesAdded: a path, and properties by interface.
     void add(const Array& arguments);
@@ -40,13 +40,13 @@ public:
     /// interface is none.
     void remove(const Array& arguments);
     /// The arguments of an object's PropertiesChanged: an interface, properties, names of properties whose
-    /// value is not told.
+    /// value is not included.
     void change(const std::string& path, const Array& arguments);
 
     /// The modem of that path; null where there is none. Valid until the next change.
     [[nodiscard]] const Modem* find(std::string_view path) const;
-    /// The modem to follow: the one of the wanted index, or, where none is wanted, `current` while it has a
-    /// SIM or nobody has, otherwise the first with a SIM, otherwise the first. Null where there is none.
+    /// The modem to follow: the one of the requested index, or, without one, `current` while it has a SIM or
+    /// none has, otherwise the first with a SIM, otherwise the first. Null where there is none.
     [[nodiscard]] const Modem* choose(std::optional<std::uint32_t> wanted, std::string_view current) const;
     /// "0, 2"; empty where there is no modem.
     [[nodiscard]] std::string indices() const;

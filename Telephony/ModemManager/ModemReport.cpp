@@ -26,11 +26,11 @@ struct RadioKind {
 // In order of their generation: a modem that is on several of them at once shows its place on the last.
 constexpr RadioKind radioKinds[] = {
     {mm::CellType::GSM, mm::Access::GSM, kVoxCellMonitorRadioAccessTechnologyGSM, MemberOf::GSMCell,
-     MemberOf::CSPlace, MemberOf::GSMSignal, "Gsm"},
+     MemberOf::CSLocation, MemberOf::GSMSignal, "Gsm"},
     {mm::CellType::UMTS, mm::Access::UMTS, kVoxCellMonitorRadioAccessTechnologyUMTS, MemberOf::UMTSCell,
-     MemberOf::CSPlace, MemberOf::UMTSSignal, "Umts"},
+     MemberOf::CSLocation, MemberOf::UMTSSignal, "Umts"},
     {mm::CellType::LTE, mm::Access::LTE, kVoxCellMonitorRadioAccessTechnologyLTE, MemberOf::LTECell,
-     MemberOf::EPSPlace, MemberOf::LTESignal, "Lte"},
+     MemberOf::EPSLocation, MemberOf::LTESignal, "Lte"},
 };
 
 std::int64_t bitsOf(const Modem& modem, std::string_view member) {
@@ -131,7 +131,7 @@ bool hasServingCell(const Dictionaries& cells) {
     });
 }
 
-DictionaryRef placeOf(const Value& location, const Modem& modem) {
+DictionaryRef servingCellFromLocation(const Value& location, const Modem& modem) {
     const Dictionary* sources = location.asDictionary();
     const std::string* place = sources ? (*sources)[mm::location3gppKey].asString() : nullptr;
     if (!place)

@@ -10,17 +10,17 @@
 #include <string_view>
 #include <vector>
 
-/// What the extra stream says of a modem, made of what ModemManager told. The member table decides what is in
-/// it.
+/// The extra stream's records of a modem, built from ModemManager's data. The member table decides what is in
+/// them.
 namespace velmora {
 
-/// The log technology that goes with the modem: that of its access technology, or, for one that has not been
-/// on a network, of the best that it can do. Empty where neither is one that the live display has.
+/// The modem's log technology: that of its access technology or, before its first registration, of its best
+/// capability. Empty where the live display supports neither.
 [[nodiscard]] std::string_view technologyOf(const Modem& modem);
 /// The same of its access technology alone.
 [[nodiscard]] std::string_view accessTechnologyOf(const Modem& modem);
 
-/// More cells, and more bearers, than any modem has; what is beyond is left out.
+/// More cells and bearers than any modem has; further ones are skipped.
 inline constexpr std::size_t maximumCells = 64;
 inline constexpr std::size_t maximumBearers = 8;
 
@@ -29,9 +29,9 @@ using Dictionaries = std::vector<DictionaryRef>;
 /// The cells of an answer of GetCellInfo. The modem adds the levels of the serving cell.
 [[nodiscard]] Dictionaries cellsOf(const Value& cellInformation, const Modem& modem);
 [[nodiscard]] bool hasServingCell(const Dictionaries& cells);
-/// The serving cell that an answer of GetLocation names; null where it names none. The modem tells of which
-/// technology it is.
-[[nodiscard]] DictionaryRef placeOf(const Value& location, const Modem& modem);
+/// The serving cell that an answer of GetLocation names; null where it names none. Its technology is the
+/// modem's.
+[[nodiscard]] DictionaryRef servingCellFromLocation(const Value& location, const Modem& modem);
 
 /// The SIM's files; `sim` are the properties of the SIM object.
 [[nodiscard]] DictionaryRef simFilesOf(const Modem& modem, const Dictionary& sim);

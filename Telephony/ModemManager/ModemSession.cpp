@@ -38,7 +38,7 @@ ModemSession::ModemSession(MainQueue& queue, ModemFollower& follower, Reports re
       _name("modem " + std::to_string(follower.modem()->index)) {
     after(std::chrono::nanoseconds::zero(), [this] {
         modemChanged();
-        turn();
+        poll();
     });
 }
 
@@ -61,18 +61,18 @@ void ModemSession::call(const BusCall& call, std::function<void(const BusReply&)
         });
 }
 
-void ModemSession::turn() {
-    if (_partTurns > 0 && --_partTurns == 0)
+void ModemSession::poll() {
+    if (_partPolls > 0 && --_partPolls == 0)
         for (const auto& [path, part] : _parts)
             if (!part.properties)
                 readPart(path);
-    askCells();
+    requestCells();
 }
 
-void ModemSession::askCells() {
-    if (_cellQuestion.turns > 0) {
-        --_cellQuestion.turns;
-        return askPlace({});
+void ModemSession::requestCells() {
+    if (_cellQuery.pollsToSkip > 0) {
+        --_cellQuery.pollsToSkip;
+        return askLocation({});
     }
     call({.path = _path,
           .interface = mm::modem,
@@ -81,60 +81,61 @@ void ModemSession::askCells() {
           .timeout = cellTimeout},
          [this](const BusReply& reply) {
              if (reply.failed()) {
-                 refused(_cellQuestion, reply, "cell information");
-                 return askPlace({});
+                 refused(_cellQuery, reply, "cell information");
+                 return askLocation({});
              }
-             _follower.faults().over(_cellQuestion.subject);
+             _follower.faults().clear(_cellQuery.subject);
              const Modem* modem = _follower.modem();
              Dictionaries cells = modem ? cellsOf(reply.value, *modem) : Dictionaries();
              if (hasServingCell(cells))
-                 return endTurn(cells);
-             askPlace(std::move(cells));
+                 return endPoll(cells);
+             askLocation(std::move(cells));
          });
 }
 
-void ModemSession::askPlace(Dictionaries cells) {
+void ModemSession::askLocation(Dictionaries cells) {
     const Modem* modem = _follower.modem();
-    if (_placeQuestion.turns > 0)
-        --_placeQuestion.turns;
+    if (_locationQuery.pollsToSkip > 0)
+        --_locationQuery.pollsToSkip;
     else if (modem && modem->has(mm::location))
         return call({.path = _path, .interface = mm::location, .method = "GetLocation", .arguments = {}},
                     [this, known = std::move(cells)](const BusReply& reply) mutable {
                         const Modem* followed = _follower.modem();
                         if (reply.failed())
-                            refused(_placeQuestion, reply, "its place in the network");
+                            refused(_locationQuery, reply, "its place in the network");
                         else
-                            _follower.faults().over(_placeQuestion.subject);
-                        if (const DictionaryRef place = followed ? placeOf(reply.value, *followed) : nullptr)
+                            _follower.faults().clear(_locationQuery.subject);
+                        if (const DictionaryRef place =
+                                followed ? servingCellFromLocation(reply.value, *followed) : nullptr)
                             known.insert(known.begin(), place);
-                        endTurn(known);
+                        endPoll(known);
                     });
-    endTurn(cells);
+    endPoll(cells);
 }
 
-void ModemSession::endTurn(const Dictionaries& cells) {
-    after(cellInterval, [this] { turn(); });
-    // An empty list is told once: it empties what is shown.
-    if (std::exchange(_cellsTold, !cells.empty()) || !cells.empty())
+void ModemSession::endPoll(const Dictionaries& cells) {
+    after(cellInterval, [this] { poll(); });
+    // An empty list is reported once: it clears the display.
+    if (std::exchange(_hadCells, !cells.empty()) || !cells.empty())
         _reports.cells(cells);
 }
 
-void ModemSession::refused(Question& question, const BusReply& reply, std::string_view what) {
-    tellFault(question.subject, reply, what);
-    // Others may be over at the next turn: a modem that is not enabled yet, one that was busy.
+void ModemSession::refused(Query& query, const BusReply& reply, std::string_view what) {
+    reportFault(query.subject, reply, what);
+    // Others may be over at the next poll: a modem that is not enabled yet, one that was busy.
     if (reply.isUnsupported() || reply.isDenied())
-        question.turns = turnsAfterRefusal - 1;
+        query.pollsToSkip = pollsAfterRefusal - 1;
 }
 
-void ModemSession::tellFault(std::string_view subject, const BusReply& reply, std::string_view what) {
+void ModemSession::reportFault(std::string_view subject, const BusReply& reply, std::string_view what) {
     const std::string end = std::string(what) + " (" + reply.reason() + ')';
     FaultLog& faults = _follower.faults();
     if (reply.isUnsupported())
-        faults.tell(subject, _name + " does not support " + end);
+        faults.report(subject, _name + " does not support " + end);
     else if (reply.isDenied())
-        faults.tell(subject, "no permission to ask " + _name + " for " + end);
+        faults.report(subject, "no permission to ask " + _name + " for " + end);
     else
-        faults.tell(subject, _name + " does not give " + end);
+        faults.report(subject, _name + " does not give " + end);
 }
 
 void ModemSession::setSignalRate() {
@@ -152,9 +153,9 @@ void ModemSession::setSignalRate() {
     call({.path = _path, .interface = mm::signal, .method = "Setup", .arguments = {signalRate}},
          [this](const BusReply& reply) {
              if (!reply.failed())
-                 return _follower.faults().over("levels");
+                 return _follower.faults().clear("levels");
              _earlierRate.reset();
-             tellFault("levels", reply, "its levels");
+             reportFault("levels", reply, "its levels");
          });
 }
 
@@ -172,8 +173,8 @@ void ModemSession::modemChanged() {
     if (!(state == _state)) {
         // What was refused in the one state may be granted in the next.
         _state = state;
-        _cellQuestion.turns = 0;
-        _placeQuestion.turns = 0;
+        _cellQuery.pollsToSkip = 0;
+        _locationQuery.pollsToSkip = 0;
         if (!_earlierRate)
             _hadSignal = false;
     }
@@ -219,10 +220,10 @@ void ModemSession::readPart(const std::string& path) {
              part->second.answered = true;
              reportLater();
              if (reply.failed()) {
-                 _partTurns = turnsAfterRefusal;
-                 return tellFault(isSIM ? "SIM" : "bearer", reply, isSIM ? "its SIM" : "a bearer");
+                 _partPolls = pollsAfterRefusal;
+                 return reportFault(isSIM ? "SIM" : "bearer", reply, isSIM ? "its SIM" : "a bearer");
              }
-             _follower.faults().over(isSIM ? "SIM" : "bearer");
+             _follower.faults().clear(isSIM ? "SIM" : "bearer");
              const DictionaryRef properties = reply.value.dictionaryRef();
              part->second.properties = properties ? properties : makeDictionary();
          });
@@ -241,7 +242,7 @@ void ModemSession::objectChanged(const std::string& path, const Array& arguments
 void ModemSession::reportLater() {
     if (std::exchange(_reporting, true))
         return;
-    after(settling, [this] {
+    after(reportDelay, [this] {
         _reporting = false;
         report();
     });
@@ -258,7 +259,7 @@ void ModemSession::report() {
         reportContexts(*modem);
 }
 
-// What waits for an answer is not told in halves.
+// Parts that wait for an answer are reported together.
 
 void ModemSession::reportFiles(const Modem& modem) {
     static const Dictionary unread;
@@ -267,9 +268,9 @@ void ModemSession::reportFiles(const Modem& modem) {
         return;
     const bool read = sim != _parts.end() && sim->second.properties;
     const DictionaryRef files = simFilesOf(modem, read ? *sim->second.properties : unread);
-    if (files->empty() || Value(files) == _toldFiles)
+    if (files->empty() || Value(files) == _reportedFiles)
         return;
-    _toldFiles = files;
+    _reportedFiles = files;
     _reports.simFiles(files);
 }
 
@@ -284,9 +285,9 @@ void ModemSession::reportContexts(const Modem& modem) {
     }
     const Dictionaries contexts = contextsOf(modem, bearers);
     Value now = valueOf(contexts);
-    if (now == _toldContexts)
+    if (now == _reportedContexts)
         return;
-    _toldContexts = std::move(now);
+    _reportedContexts = std::move(now);
     _reports.contexts(contexts);
 }
 

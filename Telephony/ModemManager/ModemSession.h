@@ -18,61 +18,62 @@
 
 namespace velmora {
 
-/// Asks the followed modem for as long as it lives, which is while a client listens and that modem is there:
-/// its cells at a steady pace, its SIM and bearers once and then by their signals. It has ModemManager poll
-/// the levels too, and puts its rate back in the end. No question is asked again before its answer. Main
+/// Queries the followed modem during its lifetime, which is while a client listens and the modem is present:
+/// the cells periodically, the SIM and bearers once and then when their signals arrive. Has ModemManager poll
+/// the levels too, and restores its rate on destruction. A query is not repeated before its answer. Main
 /// thread only.
 class ModemSession {
 public:
-    /// Where what it learns goes. Files and contexts are told when they have changed, cells as often as they
-    /// are measured.
+    /// The receivers of its reports. Files and contexts are reported when they have changed, cells at every
+    /// measurement.
     struct Reports {
         std::function<void(const Dictionaries&)> cells;
         std::function<void(const DictionaryRef&)> simFiles;
         std::function<void(const Dictionaries&)> contexts;
     };
 
-    /// From one answer about the cells to the next question.
+    /// The delay between the answer to a cell query and the next query.
     static constexpr std::chrono::seconds cellInterval{3};
-    /// A question that the modem or the bus refuses is asked again after so many turns of that interval: a
-    /// minute. Whoever sits in front of it may have changed something.
-    static constexpr int turnsAfterRefusal = 20;
-    /// Cells take a modem on a serial line a while.
+    /// A refused query is retried after this many intervals, a minute: permissions may have changed
+    /// meanwhile.
+    static constexpr int pollsAfterRefusal = 20;
+    /// The time-out of a cell query, which is slow on a serial line.
     static constexpr std::chrono::seconds cellTimeout{30};
     /// The rate, in seconds, at which ModemManager is to poll the levels.
     static constexpr std::uint32_t signalRate = 5;
-    /// Changes that come one after the other are told together.
-    static constexpr std::chrono::milliseconds settling{100};
+    /// The delay that combines changes in quick succession into one report.
+    static constexpr std::chrono::milliseconds reportDelay{100};
 
-    /// Begins to ask on the queue, not at once. All must outlive it. Precondition: the follower has a modem.
+    /// Starts querying from the queue, not inside this call. All must outlive it. Precondition: the follower
+    /// has a modem.
     ModemSession(MainQueue& queue, ModemFollower& follower, Reports reports);
     ~ModemSession();
     ModemSession(const ModemSession&) = delete;
     ModemSession& operator=(const ModemSession&) = delete;
 
-    /// The follower's observer hands on what concerns the modem.
+    /// Forwarded by the follower's observer.
     void modemChanged();
     void objectChanged(const std::string& path, const Array& arguments);
 
 private:
-    /// A question that may be refused, and how many turns it is left out for.
-    struct Question {
+    /// A query that may be refused, and for how many intervals it is skipped.
+    struct Query {
         std::string_view subject;
-        int turns = 0;
+        int pollsToSkip = 0;
     };
     /// The SIM or a bearer.
     struct Part {
         std::string_view interface;
         bool answered = false;    ///< whether with properties or with an error
-        DictionaryRef properties; ///< null until they have been told
+        DictionaryRef properties; ///< null until they have been reported
     };
 
-    void turn();
-    void askCells();
-    void askPlace(Dictionaries cells);
-    void endTurn(const Dictionaries& cells);
-    void refused(Question& question, const BusReply& reply, std::string_view what);
-    void tellFault(std::string_view subject, const BusReply& reply, std::string_view what);
+    void poll();
+    void requestCells();
+    void askLocation(Dictionaries cells);
+    void endPoll(const Dictionaries& cells);
+    void refused(Query& query, const BusReply& reply, std::string_view what);
+    void reportFault(std::string_view subject, const BusReply& reply, std::string_view what);
     void setSignalRate();
     void restoreSignalRate();
 
@@ -92,18 +93,18 @@ private:
     Reports _reports;
     std::string _path; ///< the modem's
     std::string _name; ///< "modem 0", for messages
-    Question _cellQuestion{"cells"};
-    Question _placeQuestion{"place"};
-    int _partTurns = 0;                        ///< until the parts that could not be read are read again
-    bool _cellsTold = false;                   ///< the last cells were some
-    std::optional<std::uint32_t> _earlierRate; ///< what ModemManager's rate was; absent while it is not ours
+    Query _cellQuery{"cells"};
+    Query _locationQuery{"place"};
+    int _partPolls = 0;                        ///< intervals until unreadable parts are retried
+    bool _hadCells = false;                    ///< the last answer had cells
+    std::optional<std::uint32_t> _earlierRate; ///< ModemManager's earlier rate; absent while it is unchanged
     bool _hadSignal = false;
-    Value _state;                       ///< the modem's when last looked at
+    Value _state;                       ///< the modem's at the last change
     std::string _sim;                   ///< the SIM's path
     std::vector<std::string> _bearers;  ///< the bearers' paths
     std::map<std::string, Part> _parts; ///< by path
-    Value _toldFiles;
-    Value _toldContexts;
+    Value _reportedFiles;
+    Value _reportedContexts;
     bool _reporting = false; ///< a report is on the queue
     std::shared_ptr<bool> _alive = std::make_shared<bool>(true);
 };

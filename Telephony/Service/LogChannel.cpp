@@ -23,20 +23,20 @@ void LogChannel::send(const Data& message) {
 }
 
 bool LogChannel::hasRoom() {
-    if (!isStreaming() || _application->waitingMessages() < roomyQueue) {
+    if (!isStreaming() || _application->waitingMessages() < maximumQueued) {
         _full = false;
-        _givenUp = false;
+        _isSlow = false;
         return true;
     }
     if (!_full) {
         _full = true;
-        _queue.after(patience, [weak = weak_from_this(), time = ++_fullTimes] {
+        _queue.after(slowClientTimeout, [weak = weak_from_this(), time = ++_fullTimes] {
             const auto self = weak.lock();
             if (self && self->_full && self->_fullTimes == time)
-                self->_givenUp = true;
+                self->_isSlow = true;
         });
     }
-    return _givenUp;
+    return _isSlow;
 }
 
 void LogChannel::close() {

@@ -17,10 +17,10 @@ namespace velmora {
 /// the messages go. The log server owns it, answers its commands and closes it. Main thread only.
 class LogChannel : public std::enable_shared_from_this<LogChannel> {
 public:
-    /// More than this many messages that wait for the client to take them is no room.
-    static constexpr std::size_t roomyQueue = 2000;
-    /// A client that has had no room for so long is not waited for until it has some.
-    static constexpr std::chrono::seconds patience{1};
+    /// The queue length above which the client has no room.
+    static constexpr std::size_t maximumQueued = 2000;
+    /// How long a source waits for a client without room.
+    static constexpr std::chrono::seconds slowClientTimeout{1};
 
     LogChannel(MainQueue& queue, std::shared_ptr<LocalPort> commands,
                std::shared_ptr<RemotePort> application);
@@ -32,12 +32,12 @@ public:
     [[nodiscard]] bool isOpen() const { return _open; }
     [[nodiscard]] bool isStreaming() const { return _open && _streaming; }
 
-    /// Streams from now on what the filter passes; a channel that streams already changes its filter.
+    /// Streams the messages that the filter passes; a channel that already streams changes its filter.
     void stream(LogFilter filter);
-    /// Sends the message where the channel streams and the filter passes it. Never blocks: where the client
-    /// is slow its connection drops the oldest messages and says how many.
+    /// Sends the message where the channel streams and the filter passes it. Never blocks: if the client is
+    /// slow its connection drops the oldest messages and logs how many.
     void send(const Data& message);
-    /// Whether the client can take more; true for one that is not worth waiting for.
+    /// Whether the client's queue has room; true for a client that is not waited for any more.
     [[nodiscard]] bool hasRoom();
 
     /// Closes both ports, without a call of their invalidation callbacks.
@@ -50,8 +50,8 @@ private:
     bool _open = true;
     bool _streaming = false;
     LogFilter _filter;
-    bool _full = false;    ///< it had no room when it was last looked at
-    bool _givenUp = false; ///< it has been full for longer than the patience
+    bool _full = false;   ///< it had no room at the last check
+    bool _isSlow = false; ///< it has been full for longer than `slowClientTimeout`
     std::uint64_t _fullTimes = 0;
 };
 

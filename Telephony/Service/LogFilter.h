@@ -16,7 +16,7 @@ class LogFilter {
 public:
     LogFilter() = default;
 
-    /// The filter that a start command asks for: the codes of its two lists, or everything where it has
+    /// The filter that a start command requests: the codes of its two lists, or everything where it has
     /// neither list. A list that is missing beside the other is empty. Fails for a list that is no array of
     /// numbers from 0 to 65535.
     static Result<LogFilter> fromStartCommand(const Dictionary& command);

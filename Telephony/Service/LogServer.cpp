@@ -41,7 +41,7 @@ LogServer::~LogServer() {
     stop();
 }
 
-Result<Done> LogServer::listen(std::function<void()> whenLost) {
+Result<Done> LogServer::listen(std::function<void()> onPortLost) {
     const std::string name(vox::serverPortName);
     const auto answer = [this](LocalPort&, std::int32_t messageId,
                                const Data& payload) -> std::optional<Data> {
@@ -55,12 +55,12 @@ Result<Done> LogServer::listen(std::function<void()> whenLost) {
     if (created.alreadyExisted)
         return Failure{"the port " + name + " is taken, wanted to be the only telephony service"};
     _serverPort = created.port;
-    _serverPort->setInvalidationCallback([lost = std::move(whenLost)](LocalPort& port) {
+    _serverPort->setInvalidationCallback([lost = std::move(onPortLost)](LocalPort& port) {
         logFormat(LogPriority::Error, "the port %s was closed", port.name().c_str());
         lost();
     });
     _serverPort->attachToMainQueue();
-    _source.whenTechnologyChanges([this] { technologyChanged(); });
+    _source.setTechnologyCallback([this] { technologyChanged(); });
     return Done{};
 }
 
@@ -68,12 +68,12 @@ void LogServer::stop() {
     if (const auto port = std::exchange(_serverPort, nullptr)) {
         port->setInvalidationCallback(nullptr);
         port->invalidate();
-        _source.whenTechnologyChanges(nullptr);
+        _source.setTechnologyCallback(nullptr);
     }
     for (const ChannelRef& channel : _channels)
         if (channel->isOpen())
             channel->close();
-    sweep();
+    removeClosedChannels();
 }
 
 Value LogServer::createChannel(const Data& request) {
@@ -88,25 +88,25 @@ Value LogServer::createChannel(const Data& request) {
         logLine(LogPriority::Error, "a request names no port, wanted {\"CreateLogChannel\": NAME}");
         return refusal(Refusal::Malformed);
     }
-    sweep();
+    removeClosedChannels();
     if (_channels.size() >= maximumChannels) {
-        logFormat(LogPriority::Error, "%s wants a log channel, but %zu are open already", name->c_str(),
+        logFormat(LogPriority::Error, "%s requests a log channel, but %zu are open already", name->c_str(),
                   _channels.size());
         return refusal(Refusal::TooManyChannels);
     }
     std::shared_ptr<RemotePort> application = _ports.createRemote(*name);
     if (!application) {
-        logFormat(LogPriority::Error, "%s wants a log channel, but there is no such port", name->c_str());
+        logFormat(LogPriority::Error, "%s requests a log channel, but there is no such port", name->c_str());
         return refusal(Refusal::NoSuchPort);
     }
-    // A name has one owner: an open channel to that name is one to an owner who has gone, or an earlier one
-    // of the same owner's, who would now get everything twice.
+    // A name has one owner: an open channel to that name is to an owner that has ended, or an earlier one of
+    // the same owner, which would now get everything twice.
     for (const ChannelRef& channel : _channels)
         if (channel->applicationName() == *name)
             close(*channel, *name + " has gone");
     std::shared_ptr<LocalPort> commands = createChannelPort();
     if (!commands) {
-        logFormat(LogPriority::Error, "%s wants a log channel, but no port can be made for it",
+        logFormat(LogPriority::Error, "%s requests a log channel, but no port can be made for it",
                   name->c_str());
         return refusal(Refusal::NoChannelPort);
     }
@@ -153,14 +153,14 @@ void LogServer::close(LogChannel& channel, const std::string& why) {
         return;
     logFormat(LogPriority::Notice, "%s: closed, %s", channel.name().c_str(), why.c_str());
     channel.close();
-    // Not at once: messages may be on their way to the channels just now.
+    // Deferred: messages may just now be on their way to the channels.
     _queue.async([this, weak = std::weak_ptr<bool>(_alive)] {
         if (!weak.expired())
-            sweep();
+            removeClosedChannels();
     });
 }
 
-void LogServer::sweep() {
+void LogServer::removeClosedChannels() {
     std::erase_if(_channels, [](const ChannelRef& channel) { return !channel->isOpen(); });
     const bool streaming = std::any_of(_channels.begin(), _channels.end(),
                                        [](const ChannelRef& channel) { return channel->isStreaming(); });
@@ -213,8 +213,8 @@ void LogServer::startStreaming(LogChannel& channel, const Dictionary& command) {
         logFormat(LogPriority::Error, "%s: %s", channel.name().c_str(), filter.reason().c_str());
         return;
     }
-    // Whoever has gone must not keep a run of the source alive that a new client would then join half-way.
-    sweep();
+    // A client that has ended must not keep the source running, or the new client would join in mid-run.
+    removeClosedChannels();
     channel.stream(*std::move(filter));
     logFormat(LogPriority::Notice, "%s: streaming to %s", channel.name().c_str(),
               channel.applicationName().c_str());
@@ -227,18 +227,18 @@ void LogServer::startStreaming(LogChannel& channel, const Dictionary& command) {
         channel.send(message);
 }
 
-void LogServer::take(const Data& message) {
-    remember(message);
+void LogServer::receive(const Data& message) {
+    cacheExtra(message);
     // A channel may close on the way; none is added or removed.
     for (const ChannelRef& channel : _channels)
         channel->send(message);
 }
 
-void LogServer::remember(const Data& message) {
+void LogServer::cacheExtra(const Data& message) {
     const auto header = LogMessage::parse(message.bytes());
     if (!header || header->type != LogMessage::extraType)
         return;
-    if (_latestExtra.size() < maximumRemembered || _latestExtra.contains(header->code))
+    if (_latestExtra.size() < maximumCachedExtra || _latestExtra.contains(header->code))
         _latestExtra.insert_or_assign(header->code, message);
 }
 

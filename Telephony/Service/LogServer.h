@@ -19,18 +19,18 @@
 
 namespace velmora {
 
-/// The telephony service's ports: the server port, on which clients ask for log channels, and the channels.
+/// The telephony service's ports: the server port, on which clients request log channels, and the channels.
 ///
-/// The source runs while at least one channel streams. It is started when the first one begins and stopped
-/// when the last one has gone, so that a lone client always sees the stream from its beginning. A client that
-/// joins later first gets the latest message of each code of the extra stream again, since those describe a
-/// state. A channel closes when the connection to its client's port ends, or when a new one is made for the
-/// same port. When the source's technology changes all channels close, so that their clients connect again
-/// and ask for it anew; while the source does not know its technology, GetTechnology is answered without one.
-/// Commands that make no sense give an error line and change nothing. Main thread only.
+/// The source runs while at least one channel streams. It is started with the first one and stopped after the
+/// last, so that a single client always gets the stream from its start. A client that joins later first gets
+/// the latest message of each code of the extra stream, since those describe a state. A channel closes when
+/// the connection to its client's port ends, or when a new one is made for the same port. When the source's
+/// technology changes all channels close, so that their clients reconnect and query it again; while the
+/// source's technology is unknown, GetTechnology is answered without one. Invalid commands are logged as
+/// errors and ignored. Main thread only.
 class LogServer final : private LogSink {
 public:
-    /// What a request for a channel is refused with.
+    /// The reasons for refusing a request for a channel.
     enum class Refusal : std::int32_t {
         NoSuchPort = 1,      ///< the named port cannot be connected to
         Malformed = 2,       ///< the request is no dictionary that names a port
@@ -39,8 +39,8 @@ public:
     };
     static constexpr std::size_t maximumChannels = 64;
 
-    /// How many codes of the extra stream are remembered; those of a strange recording may be many.
-    static constexpr std::size_t maximumRemembered = 16;
+    /// How many codes of the extra stream are cached; an unusual recording may have many.
+    static constexpr std::size_t maximumCachedExtra = 16;
 
     /// All three must outlive the server.
     LogServer(MessagePorts& ports, MainQueue& queue, LogSource& source);
@@ -48,9 +48,9 @@ public:
     LogServer(const LogServer&) = delete;
     LogServer& operator=(const LogServer&) = delete;
 
-    /// Takes the service's name and serves from now on. `whenLost` is called when the platform closes the
+    /// Takes the service's name and serves from now on. `onPortLost` is called when the platform closes the
     /// server port. Fails when another service has the name or no port can be made.
-    Result<Done> listen(std::function<void()> whenLost);
+    Result<Done> listen(std::function<void()> onPortLost);
     /// Closes all ports and stops the source. Does nothing when not listening.
     void stop();
 
@@ -59,19 +59,19 @@ public:
 private:
     using ChannelRef = std::shared_ptr<LogChannel>;
 
-    void take(const Data& message) override;
+    void receive(const Data& message) override;
     [[nodiscard]] bool hasRoom() const override;
 
     [[nodiscard]] Value createChannel(const Data& request);
     [[nodiscard]] std::shared_ptr<LocalPort> createChannelPort();
-    /// `why` stands in the log.
+    /// `why` is logged.
     void close(LogChannel& channel, const std::string& why);
     void technologyChanged();
-    /// Empties `_channels` of those that are closed and stops the source after the last.
-    void sweep();
+    /// Removes closed channels from `_channels` and stops the source after the last.
+    void removeClosedChannels();
     [[nodiscard]] std::optional<Data> command(const std::string& channelName, const Data& payload);
     void startStreaming(LogChannel& channel, const Dictionary& command);
-    void remember(const Data& message);
+    void cacheExtra(const Data& message);
 
     MessagePorts& _ports;
     MainQueue& _queue;
@@ -81,7 +81,7 @@ private:
     std::uint64_t _channelsMade = 0;
     bool _sourceRuns = false;
     std::map<std::uint16_t, Data> _latestExtra; ///< of the source's present run, by code
-    /// Tasks on the queue hold it weakly: they do nothing once the server is gone.
+    /// Queued tasks hold it weakly: they do nothing after the server's destruction.
     std::shared_ptr<bool> _alive = std::make_shared<bool>(true);
 };
 

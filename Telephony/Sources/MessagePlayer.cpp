@@ -15,7 +15,7 @@ using std::chrono::nanoseconds;
 /// What sending and sleeping may take beyond the sleep that was asked for. More is the machine's own sleep,
 /// or a clock that was set: the messages wait for it.
 constexpr nanoseconds longestOversleep = std::chrono::seconds(1);
-/// How far behind it may be, in nanoseconds of the clock, and still catch up.
+/// The largest delay, in nanoseconds of the clock, that it catches up.
 constexpr double longestLag = 250e6;
 constexpr nanoseconds longestSleep = std::chrono::hours(1);
 /// How often a sink without room is asked again.
@@ -88,7 +88,7 @@ void MessagePlayer::wake(const std::shared_ptr<Run>& run) {
         // Sending may stop the run.
         const auto offset_ns = static_cast<double>(run->event->offset.count());
         run->event.reset();
-        run->sink.take(message);
+        run->sink.receive(message);
         if (run->stopped)
             return;
         if (sent == batch - 1)

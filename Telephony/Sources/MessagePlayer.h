@@ -16,20 +16,20 @@
 
 namespace velmora {
 
-/// Plays a list of messages to a sink in time: each when its offset has come, `speed` times as fast as the
-/// offsets say. In one wake-up it sends a bounded number, so that playing starves nothing; where that is not
-/// enough to keep up, it plays as fast as it can, and what it is behind by more than a quarter of a second it
-/// does not catch up. A clock that is set meanwhile neither stops nor rushes it. Main thread only.
+/// Plays a list of messages to a sink, each at its offset divided by `speed`. It sends a bounded number per
+/// wake-up, so that playing starves nothing; where that is too slow it plays as fast as it can, and does not
+/// catch up a delay of more than a quarter of a second. Setting the clock neither stops nor accelerates it.
+/// Main thread only.
 class MessagePlayer {
 public:
-    /// Gives the next message; none at the end.
+    /// Returns the next message; none at the end.
     using Next = std::function<std::optional<ScenarioEvent>()>;
 
-    /// As fast as the sink has room, whatever the offsets say.
+    /// As fast as the sink has room, ignoring the offsets.
     static constexpr double unpaced = 0;
     /// The most messages of one wake-up.
     static constexpr int batch = 500;
-    /// The shortest sleep between two wake-ups. Others have their turn in it.
+    /// The shortest sleep between two wake-ups, in which other work runs.
     static constexpr std::chrono::milliseconds shortestSleep{1};
 
     /// Queue and clock must outlive the player. Precondition: speed >= 0.
@@ -40,7 +40,7 @@ public:
 
     /// Plays from now on, never from inside this call. Precondition: not started.
     void start(LogSink& sink, Next next);
-    /// Plays no more; allowed at any time, also from inside the sink.
+    /// Stops playing; allowed at any time, also from inside the sink.
     void stop();
 
 private:

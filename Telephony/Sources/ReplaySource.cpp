@@ -23,16 +23,16 @@ Result<std::unique_ptr<ReplaySource>> ReplaySource::create(MainQueue& queue, con
     auto reader = open();
     if (!reader)
         return Failure{name + ": " + reader.reason()};
-    // A file may tell its technology only by its messages.
+    // Some files have no technology until the first messages are read.
     if ((*reader)->technology().empty())
         static_cast<void>((*reader)->next());
     if ((*reader)->failure())
         return Failure{name + ": " + (*reader)->failure()->reason};
-    const std::string& told = options.technology.empty() ? (*reader)->technology() : options.technology;
-    if (told.empty())
+    const std::string& named = options.technology.empty() ? (*reader)->technology() : options.technology;
+    if (named.empty())
         return Failure{name + ": the file does not say which technology its messages are of; technology=NAME "
                               "supplies it"};
-    std::string technology = technologyConstant(told);
+    std::string technology = technologyConstant(named);
     return std::unique_ptr<ReplaySource>(
         new ReplaySource(queue, clock, std::move(name), std::move(technology), std::move(open), options));
 }
@@ -70,9 +70,9 @@ std::optional<ScenarioEvent> ReplaySource::next() {
     if (!_reader)
         return std::nullopt;
     std::optional<LoggedMessage> message = _reader->next();
-    tellLosses();
+    reportLosses();
     if (!message) {
-        tellEnd();
+        reportEnd();
         // A round that gave nothing would come again and again without end.
         if (!_loop || _played == 0 || !rewind())
             return std::nullopt;
@@ -88,10 +88,10 @@ std::optional<ScenarioEvent> ReplaySource::next() {
     return ScenarioEvent{_offset, std::move(message->message)};
 }
 
-void ReplaySource::tellLosses() {
+void ReplaySource::reportLosses() {
     const auto& losses = _reader->losses();
-    for (; _lossesTold < losses.size(); ++_lossesTold) {
-        const Loss& loss = losses[_lossesTold];
+    for (; _lossesReported < losses.size(); ++_lossesReported) {
+        const Loss& loss = losses[_lossesReported];
         logFormat(LogPriority::Warning, "%s: %llu bytes left out at offset %llu (record %llu): %s",
                   _name.c_str(), static_cast<unsigned long long>(loss.bytes),
                   static_cast<unsigned long long>(loss.offset),
@@ -99,12 +99,12 @@ void ReplaySource::tellLosses() {
     }
 }
 
-void ReplaySource::tellEnd() {
+void ReplaySource::reportEnd() {
     if (const auto& failure = _reader->failure())
         logFormat(LogPriority::Error, "%s: %s", _name.c_str(), failure->reason.c_str());
     const auto& totals = _reader->lossTotals();
-    if (!_totalTold && totals.losses > _reader->losses().size()) {
-        _totalTold = true;
+    if (!_totalReported && totals.losses > _reader->losses().size()) {
+        _totalReported = true;
         logFormat(LogPriority::Warning, "%s: %llu bytes left out in %llu places", _name.c_str(),
                   static_cast<unsigned long long>(totals.bytes),
                   static_cast<unsigned long long>(totals.losses));

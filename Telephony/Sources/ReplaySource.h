@@ -17,22 +17,22 @@
 
 namespace velmora {
 
-/// Plays a file of log messages at the pace of its time stamps, each start from the file's beginning. Time
-/// that runs backwards in the file counts as no time, and a pause of more than a minute as one minute. What
-/// of the file cannot be read is told in the log, once. Main thread only.
+/// Plays a file of log messages by its time stamps, each start from the file's first message. Time that goes
+/// backward counts as zero, and a pause of more than a minute as one minute. Losses in the file are logged
+/// once. Main thread only.
 class ReplaySource final : public LogSource {
 public:
     using Open = std::function<Result<std::unique_ptr<MessageReader>>()>;
 
     struct Options {
         double speed = 1;            ///< 0: as fast as the clients take it
-        bool loop = false;           ///< at the end begin again, a second later
-        std::string technology = {}; ///< goes before the one that the file tells; empty for that one
+        bool loop = false;           ///< restart at the end, after a second
+        std::string technology = {}; ///< overrides the file's; empty for the file's
     };
 
-    /// Opens the file (`open` does; `name` is what messages call it) to learn its technology. Fails for one
-    /// that cannot be read or, unless the options name it, does not tell which technology it is of. Queue and
-    /// clock must outlive it.
+    /// Opens the file by `open` to determine its technology; messages use `name` for it. Fails for a file
+    /// that cannot be read or, unless the options have it, whose technology is unknown. Queue and clock must
+    /// outlive it.
     static Result<std::unique_ptr<ReplaySource>> create(MainQueue& queue, const Clock& clock,
                                                         std::string name, Open open, const Options& options);
 
@@ -46,8 +46,8 @@ private:
 
     bool rewind();
     [[nodiscard]] std::optional<ScenarioEvent> next();
-    void tellLosses();
-    void tellEnd();
+    void reportLosses();
+    void reportEnd();
 
     std::string _name;
     std::string _technology;
@@ -55,11 +55,11 @@ private:
     bool _loop;
     MessagePlayer _player;
     std::unique_ptr<MessageReader> _reader; ///< null when not playing
-    std::optional<Time> _lastTime;          ///< of the message before, in this round
-    std::chrono::nanoseconds _offset{0};    ///< of the message before
+    std::optional<Time> _lastTime;          ///< of the previous message, in this round
+    std::chrono::nanoseconds _offset{0};    ///< of the previous message
     std::uint64_t _played = 0;              ///< messages of this round
-    std::size_t _lossesTold = 0;
-    bool _totalTold = false;
+    std::size_t _lossesReported = 0;
+    bool _totalReported = false;
 };
 
 } // namespace velmora

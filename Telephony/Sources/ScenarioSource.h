@@ -13,7 +13,7 @@
 
 namespace velmora {
 
-/// Plays a scenario; each start makes it anew and so plays the same messages. Main thread only.
+/// Plays a scenario; each start creates it again and so plays the same messages. Main thread only.
 class ScenarioSource final : public LogSource {
 public:
     using Make = std::function<std::unique_ptr<Scenario>()>;

@@ -51,15 +51,15 @@ std::string sourceHelp(std::string_view program) {
     const std::string call = "  " + std::string(program) + " --source ";
     std::string help = "Sources:\n"
                        "  scenario:NAME[,seed=N][,speed=X]  a synthetic drive, the same for the same seed;"
-                       " speed 1 is its own pace\n";
+                       " speed 1 is real time\n";
     for (const ScenarioKind& kind : scenarioKinds())
         help += "    " + std::string(kind.name) + ": " + std::string(kind.description) + "\n";
     help += "  replay:FILE[,speed=X][,loop][,technology=NAME]\n"
-            "    a recording, snapshot or DLF log at its own pace; speed max is as fast as clients take it;"
-            " technology, where the file does not tell its own, is one of ";
+            "    a recording, snapshot or DLF log in recorded time; speed max is as fast as clients take it;"
+            " technology, for a file that does not name its own, is one of ";
     help += technologyNames() + "\n";
     help += "  modemmanager[,modem=INDEX]\n"
-            "    the modem that ModemManager looks after, live; without INDEX the first that has a SIM\n\n";
+            "    the modem that ModemManager manages, live; without INDEX the first that has a SIM\n\n";
     help += "Examples:\n";
     help += call + "scenario:gsm,seed=7,speed=2\n";
     help += call + "replay:drive.pcapng,speed=max,loop\n";

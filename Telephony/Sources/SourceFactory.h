@@ -15,11 +15,11 @@
 
 namespace velmora {
 
-/// The source that was chosen. Fails for a file that cannot be played. Queue and clock must outlive it.
+/// Creates the chosen source. Fails for a file that cannot be played. Queue and clock must outlive it.
 Result<std::unique_ptr<LogSource>> makeSource(const SourceChoice& choice, MainQueue& queue,
                                               const Clock& clock);
 
-/// What the program's help says of the sources, with an example of each.
+/// The help text about the sources, with an example of each.
 [[nodiscard]] std::string sourceHelp(std::string_view program);
 
 } // namespace velmora

@@ -34,7 +34,7 @@ std::optional<Number> numberOf(std::string_view text) {
     return number;
 }
 
-Result<Done> takeSpeed(std::string_view text, bool unpacedAllowed, std::optional<double>& speed) {
+Result<Done> parseSpeed(std::string_view text, bool unpacedAllowed, std::optional<double>& speed) {
     if (speed)
         return Failure{"speed is given twice, wanted once"};
     speed = unpacedAllowed && text == "max" ? 0.0 : numberOf<double>(text);
@@ -66,7 +66,7 @@ Result<SourceChoice> parseScenario(std::string_view text) {
                 return Failure{"seed is " + quoted(number) +
                                ", wanted a whole number from 0 to 18446744073709551615"};
         } else if (option.starts_with(speedKey)) {
-            const auto taken = takeSpeed(option.substr(speedKey.size()), false, speed);
+            const auto taken = parseSpeed(option.substr(speedKey.size()), false, speed);
             if (!taken)
                 return Failure{taken.reason()};
         } else {
@@ -88,7 +88,7 @@ Result<SourceChoice> parseReplay(std::string_view text) {
                 return Failure{"loop is given twice, wanted once"};
             choice.loop = true;
         } else if (option.starts_with(speedKey)) {
-            const auto taken = takeSpeed(option.substr(speedKey.size()), true, speed);
+            const auto taken = parseSpeed(option.substr(speedKey.size()), true, speed);
             if (!taken)
                 return Failure{taken.reason()};
         } else if (option.starts_with(technologyKey)) {

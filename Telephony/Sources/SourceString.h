@@ -15,7 +15,7 @@ namespace velmora {
 
 /// "scenario:NAME[,seed=N][,speed=X]"
 struct ScenarioChoice {
-    std::string name; ///< one that the registry knows
+    std::string name; ///< one in the registry
     std::uint64_t seed = 1;
     double speed = 1; ///< above 0
 };
@@ -25,7 +25,7 @@ struct ReplayChoice {
     std::string file;
     double speed = 1; ///< 0: as fast as the clients take it
     bool loop = false;
-    std::string technology = {}; ///< before the one that the file tells; a short name, empty for the file's
+    std::string technology = {}; ///< overrides the file's; a short name, empty for the file's
 };
 
 /// "modemmanager[,modem=INDEX]"
@@ -40,9 +40,9 @@ inline constexpr std::string_view sourceForms =
     "scenario:NAME[,seed=N][,speed=X], replay:FILE[,speed=X][,loop][,technology=NAME] or "
     "modemmanager[,modem=INDEX]";
 
-/// Reads what the command line says of the source. Options may come in any order, each once. A file's name
-/// may hold commas: what follows its last one that is no option ("loop", "speed=...", "technology=...")
-/// belongs to the name. The reason gives what was found and what was wanted.
+/// Parses the command line's source. Options may be in any order, each once. A file's name may hold commas:
+/// what follows its last one that is no option ("loop", "speed=...", "technology=...") belongs to the name.
+/// The reason gives the found and the expected value.
 Result<SourceChoice> parseSource(std::string_view text);
 
 } // namespace velmora

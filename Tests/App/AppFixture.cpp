@@ -71,7 +71,7 @@ Data AppFixture::bytes(const Value& display) {
 
 void AppFixture::launch() {
     app.applicationDidFinishLaunching(app);
-    settle();
+    runUntilIdle();
 }
 
 void AppFixture::launchAndConnect() {
@@ -83,21 +83,21 @@ void AppFixture::launchAndConnect() {
 void AppFixture::show(const Value& display) {
     ASSERT_TRUE(platform.ports.deliver(logChannelPortName(), 0, bytes(display)));
     platform.queue.advance(2s);
-    settle();
+    runUntilIdle();
 }
 
 void AppFixture::loseService() {
     platform.telephony.available = false;
     platform.ports.sever(channelName);
     platform.queue.advance(2s);
-    settle();
+    runUntilIdle();
 }
 
 bool AppFixture::eventually(const std::function<bool()>& condition) {
     return app.runUntil(condition, 20s);
 }
 
-void AppFixture::settle() {
+void AppFixture::runUntilIdle() {
     for (int i = 0; i < 5; ++i)
         QApplication::processEvents();
 }
@@ -145,7 +145,7 @@ void AppFixture::click(QWidget* widget, double x, double y) {
     QWidget* window = widget->window();
     const QPoint place = widget->mapTo(window, QPoint(static_cast<int>(x), static_cast<int>(y)));
     QTest::mouseClick(window->windowHandle(), Qt::LeftButton, {}, place);
-    settle();
+    runUntilIdle();
 }
 
 void AppFixture::clickRow(TableView& table, std::size_t row) {

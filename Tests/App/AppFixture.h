@@ -32,7 +32,7 @@ class QWidget;
 
 namespace velmora {
 
-/// What the application stands on in a test: fakes in virtual time, and files in a directory of the test's.
+/// The application's platform in a test: fakes in virtual time, and files in a directory of the test's.
 class TestAppPlatform final : public AppPlatform {
 public:
     explicit TestAppPlatform(const LinuxFileSystem::Options& options) : linuxFiles(options) {}
@@ -72,7 +72,7 @@ protected:
     /// Serves events until the condition holds; false after twenty seconds.
     bool eventually(const std::function<bool()>& condition);
     /// Serves the events that are there.
-    void settle();
+    void runUntilIdle();
 
     [[nodiscard]] static Value dictionary(std::initializer_list<Dictionary::Entry> entries) {
         return Value(std::make_shared<Dictionary>(entries));

@@ -26,14 +26,14 @@ protected:
 
     void open() {
         app.showSaveView();
-        settle();
+        runUntilIdle();
         ASSERT_NE(saveScreen(), nullptr);
     }
     /// Presses Save and lets the screen close.
     void save() {
         saveScreen()->savePressed();
         platform.queue.runPending();
-        settle();
+        runUntilIdle();
     }
     [[nodiscard]] std::vector<std::string> listed() const {
         TableView& table = saveScreen()->saveContentTable();

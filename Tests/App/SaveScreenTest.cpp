@@ -27,11 +27,11 @@ protected:
     void type(const std::string& text) {
         for (const char c : text)
             QTest::keyClick(field(), c);
-        settle();
+        runUntilIdle();
     }
     void press(Qt::Key key, Qt::KeyboardModifiers modifiers = {}) {
         QTest::keyClick(field()->window()->windowHandle(), key, modifiers);
-        settle();
+        runUntilIdle();
     }
     [[nodiscard]] QWidget* field() const { return saveScreen()->saveDescription().widget(); }
 };
@@ -150,7 +150,7 @@ TEST_F(SaveScreenTest, ReturnTakesTheKeyboardAwayAndIsAnsweredTrue) {
     open();
     ASSERT_TRUE(saveScreen()->saveDescription().becomeFirstResponder());
     QTest::keyClick(field(), Qt::Key_Return);
-    settle();
+    runUntilIdle();
     EXPECT_FALSE(saveScreen()->saveDescription().isFirstResponder());
     EXPECT_NE(saveScreen(), nullptr);
     EXPECT_THAT(files(), IsEmpty());

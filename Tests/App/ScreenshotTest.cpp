@@ -27,7 +27,7 @@ struct Look {
     bool isDark;
 };
 
-/// Draws the screens as they stand on a synthetic drive into "screenshots" beside the tests.
+/// Draws the screens during a synthetic drive into "screenshots" beside the tests.
 class ScreenshotTest : public AppFixture, public testing::WithParamInterface<Look>, public LogSink {
 protected:
     ScreenshotTest() {
@@ -42,7 +42,7 @@ protected:
     }
     ~ScreenshotTest() override { setResources(&resources); }
 
-    void take(const Data& message) override {
+    void receive(const Data& message) override {
         static_cast<void>(platform.ports.deliver(logChannelPortName(), 0, message));
     }
     [[nodiscard]] bool hasRoom() const override { return true; }
@@ -53,7 +53,7 @@ protected:
         const std::size_t count = pane->tableView().numberOfRowsInSection(0);
         for (std::size_t row = 0; row < count; ++row) {
             pane->tableView().scrollToRow(IndexPath(0, row));
-            settle();
+            runUntilIdle();
             const auto shown = cell(*pane, row);
             if (shown && shown->key().text() == name) {
                 clickRow(row);
@@ -64,11 +64,11 @@ protected:
     }
     void back() {
         static_cast<void>(app.navController().popViewController(false));
-        settle();
+        runUntilIdle();
     }
     void shoot(const std::string& name) {
         QWidget* window = app.navController().view().widget()->window();
-        settle();
+        runUntilIdle();
         const QString file = QString::fromStdString(std::string(VELMORA_BUILD_DIR "/screenshots/") + name +
                                                     "-" + GetParam().name + ".png");
         const QImage image = window->grab().toImage();
@@ -92,14 +92,14 @@ TEST_P(ScreenshotTest, ShowsADrive) {
     // The pointer rests where nothing shows that it is there.
     QWidget* window = app.navController().view().widget()->window();
     QCursor::setPos(window->mapToGlobal(QPoint(window->width() / 2, window->height() - 120)));
-    settle();
+    runUntilIdle();
     const auto choice = parseSource("scenario:gsm,seed=1");
     ASSERT_TRUE(choice);
     const auto source = makeSource(*choice, platform.queue, platform.clock);
     ASSERT_TRUE(source);
     (*source)->start(*this);
     platform.queue.advance(30s);
-    settle();
+    runUntilIdle();
     shoot("root");
     open("GSM");
     shoot("sections");

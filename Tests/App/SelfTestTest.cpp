@@ -19,7 +19,7 @@ protected:
     void runSelfTest() {
         for (int i = 0; i < 200 && log.textsAt(LogPriority::Notice).empty() && !failed(); ++i) {
             platform.queue.advance(20ms);
-            settle();
+            runUntilIdle();
         }
     }
     [[nodiscard]] bool failed() const {

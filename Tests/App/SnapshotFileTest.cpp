@@ -18,7 +18,7 @@ namespace {
 using namespace std::chrono_literals;
 using testing::ElementsAre;
 
-/// The file that the save screen leaves behind.
+/// The file that the save screen writes.
 class SnapshotFileTest : public SaveScreenFixture {
 protected:
     [[nodiscard]] static std::vector<std::string> keysOf(const Value& value) {
@@ -88,12 +88,12 @@ TEST_F(SnapshotFileTest, OfABinaryFamilyHasTheWholeLogToo) {
     launchAndConnect();
     ASSERT_TRUE(platform.ports.deliver(logChannelPortName(), 0, record(0x7132, "01 00 00")));
     platform.queue.advance(2s);
-    settle();
+    runUntilIdle();
     open();
     // The version report of 161 bytes, and the 16-byte record less its type byte.
     EXPECT_THAT(listed(), ElementsAre("Snapshot (2026-11-16 05:00:02 +0000)", "DLF binary (176 bytes)"));
     save();
-    // The record's length (15), its code, eight zeros and the payload close the log; the raw material of the
+    // The record's length (15), its code, eight zeros and the payload close the log; the raw messages of the
     // display is the whole record.
     EXPECT_EQ(python("[type(p['Data'][1]['DLF']).__name__, len(p['Data'][1]['DLF']), "
                      "p['Data'][1]['DLF'][161:].hex(), p['Data'][0]['DisplayState'].hex()]",
@@ -178,7 +178,7 @@ TEST_F(SnapshotFileTest, ValueThatAListCannotCarryIsAFailedWrite) {
     ASSERT_TRUE(message);
     ASSERT_TRUE(platform.ports.deliver(logChannelPortName(), 0, Data::copyOf(*message)));
     platform.queue.advance(2s);
-    settle();
+    runUntilIdle();
     open();
     save();
     EXPECT_THAT(files(), testing::IsEmpty());

@@ -92,7 +92,7 @@ TEST_F(VelmoraAppTest, WithTheMarkerEveryPaneDoes) {
     EXPECT_TRUE(app.allowSaveButton());
     for (std::size_t i = 0; i < depth(); ++i)
         EXPECT_TRUE(offersSave(*pane(i))) << i;
-    // Gone again, which the next look at it finds.
+    // Removed again, which the next access finds.
     std::filesystem::remove_all(directory / "QuorraInternal");
     app.getSaveButtonPref();
     EXPECT_FALSE(app.allowSaveButton());
@@ -111,7 +111,7 @@ TEST_F(VelmoraAppTest, StatusGoesFromConnectingToTheTimeAndBack) {
     EXPECT_THAT(rows(*pane(0)), ElementsAre("A", "C"));
 
     loseService();
-    // Nothing was redrawn; a navigation shows how things stand.
+    // Nothing was redrawn; a navigation shows the current values.
     EXPECT_EQ(status(*pane(0)), "Updated 2026-11-16 at 06:00:02");
     clickRow(1);
     EXPECT_EQ(status(*topPane()), "Connecting...");
@@ -148,7 +148,7 @@ TEST_F(VelmoraAppTest, RedrawWithoutATreeReloadsTheRootPane) {
     ASSERT_TRUE(platform.ports.deliver(logChannelPortName(), 0, bytes(threeLevels())));
     platform.ports.sever(channelName);
     platform.queue.advance(2s);
-    settle();
+    runUntilIdle();
     EXPECT_EQ(pane(0)->title(), "Velmora");
     EXPECT_EQ(pane(0)->tableView().numberOfRowsInSection(0), 0u);
     EXPECT_EQ(status(*pane(0)), "Connecting...");
@@ -164,7 +164,7 @@ TEST_F(VelmoraAppTest, RedrawReloadsEveryPaneOnTheStack) {
     EXPECT_EQ(status(*pane(2)), "Updated 2026-11-16 at 05:00:04");
     static_cast<void>(app.navController().popViewController(false));
     static_cast<void>(app.navController().popViewController(false));
-    settle();
+    runUntilIdle();
     EXPECT_EQ(depth(), 1u);
     // What was a section is a value now, in a cell that was made for a section: only its name shows.
     EXPECT_THAT(rows(*pane(0)), ElementsAre("A", "C"));
@@ -205,7 +205,7 @@ TEST_F(VelmoraAppTest, SaveScreenIsOpenedOnceAndClosed) {
     launchAndConnect();
     app.closeSaveView(); // nothing to close
     app.showSaveView();
-    settle();
+    runUntilIdle();
     const auto first = saveScreen();
     ASSERT_NE(first, nullptr);
     EXPECT_TRUE(first->view().widget()->isVisible());
@@ -227,15 +227,15 @@ TEST_F(VelmoraAppTest, SaveScreenCanBeOpenedWhileTheEarlierOneIsStillLeaving) {
     app.showSaveView();
     app.closeSaveView();
     app.showSaveView();
-    settle();
+    runUntilIdle();
     ASSERT_NE(saveScreen(), nullptr);
     EXPECT_TRUE(saveScreen()->view().widget()->isVisible());
 }
 
-TEST_F(VelmoraAppTest, RedrawGoesOnUnderTheSaveScreen) {
+TEST_F(VelmoraAppTest, RedrawContinuesUnderTheSaveScreen) {
     openThreePanes();
     app.showSaveView();
-    settle();
+    runUntilIdle();
     show(dictionary({{"C", "4"}, {"D", "5"}}));
     EXPECT_EQ(depth(), 1u);
     EXPECT_NE(saveScreen(), nullptr);

@@ -36,7 +36,7 @@ protected:
     }
     void press(Qt::Key key, Qt::KeyboardModifiers modifiers = {}) {
         QTest::keyClick(topPane()->view().widget()->window()->windowHandle(), key, modifiers);
-        settle();
+        runUntilIdle();
     }
 };
 
@@ -127,13 +127,13 @@ TEST_F(VelmoraPaneControllerTest, RowsAreLaidOutInTheTablesWidth) {
     EXPECT_NEAR(right, width, 1);
 }
 
-TEST_F(VelmoraPaneControllerTest, RowsAreLaidOutAnewWhenTheWindowChangesItsWidth) {
+TEST_F(VelmoraPaneControllerTest, RowsAreLaidOutAgainWhenTheWidthChanges) {
     launchAndConnect();
     show(twoSections());
     QWidget* window = pane(0)->view().widget()->window();
     window->resize(window->width() + 300, window->height());
     ASSERT_TRUE(eventually([&] { return pane(0)->tableView().bounds().width >= window->width(); }));
-    settle();
+    runUntilIdle();
     const auto row = cell(*pane(0), 1);
     EXPECT_EQ(row->contentView().bounds().width, window->width());
     EXPECT_EQ(row->value()->frame().x, window->width() - row->value()->frame().width);
@@ -154,7 +154,7 @@ TEST_F(VelmoraPaneControllerTest, SectionOpensItsPaneWithThisOnesStatus) {
 TEST_F(VelmoraPaneControllerTest, NewPaneHasTheStatusBeforeTheStackShowsIt) {
     launchAndConnect();
     show(twoSections());
-    app.navController().setDelegate(nullptr); // nobody refreshes it as it is shown
+    app.navController().setDelegate(nullptr); // it is not refreshed when shown
     pane(0)->setStatus("as it was", true);
     clickRow(0);
     ASSERT_EQ(depth(), 2u);

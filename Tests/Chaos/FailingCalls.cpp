@@ -16,7 +16,7 @@
 //
 // Reads and writes are those of regular files and of standard input and output. Those of sockets and of the
 // event loop's own descriptors are not: what becomes of a connection is tried by killing the other end. Nor
-// are those of standard error, which is where the program is to tell of the failure. Memory that Qt asks the
+// are those of standard error, which is where the program has to report the failure. Memory that Qt asks the
 // C library for by itself is left alone: it does not look whether it got it (QObject::connect does not), so
 // that nothing above it could. What it gets with `new` is counted, but for what a QWaitCondition consists of:
 // Qt's record of a thread has one, and its clean-up after that failure follows a pointer that is not set yet.

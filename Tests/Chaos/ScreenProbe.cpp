@@ -5,7 +5,7 @@
 #include "App/VelmoraApp.h"
 #include "Platform/Console.h"
 #include "Platform/Linux/Files/FileResources.h"
-#include "Platform/Linux/Files/LargeMemory.h"
+#include "Platform/Linux/Files/LargeAllocations.h"
 #include "Platform/Linux/ProgramLog.h"
 #include "Platform/Linux/Termination.h"
 
@@ -28,7 +28,7 @@ double now_s() {
     return std::chrono::duration<double>(std::chrono::steady_clock::now().time_since_epoch()).count();
 }
 
-/// Resident memory; 0 where the system does not tell.
+/// Resident memory; 0 where the system does not report it.
 long resident_KiB() {
     std::ifstream status("/proc/self/status");
     for (std::string line; std::getline(status, line);)
@@ -78,7 +78,7 @@ private:
 int main(int argc, char** argv) {
     using namespace velmora;
     endOnUncaughtExceptions("screen-probe");
-    giveBackLargeMemory();
+    returnLargeAllocations();
     redirectConsole(stderr);
     const ProgramLog log(LogKind::Stderr, LogPriority::Error, "screen-probe");
     FileResources files;

@@ -78,7 +78,7 @@ def product_digest(path: Path, copy: Path | None) -> str:
         return "missing"
     digest = hashlib.sha256()
     with path.open("rb") as file, open(copy or os.devnull, "wb") as kept:
-        # A snapshot is read whole: what is looked for in it stands anywhere.
+        # A snapshot is read completely: the text may be anywhere in it.
         chunk = without_stamp(path.suffix, file.read(-1 if path.suffix == ".velmora" else CHUNK))
         while chunk:
             digest.update(chunk)

@@ -45,26 +45,26 @@ Data contentOf(const fs::path& path) {
     return Data(std::vector<std::uint8_t>(std::istreambuf_iterator<char>(file), {}));
 }
 
-TEST_P(FuzzTargetTest, BearsWhatFuzzersOnceFound) {
+TEST_P(FuzzTargetTest, AcceptsFormerFindings) {
     for (const fs::path& file : findingsOf(GetParam().name)) {
         SCOPED_TRACE(file.filename().string());
         EXPECT_NO_THROW(target->run(contentOf(file).bytes()));
     }
 }
 
-TEST_P(FuzzTargetTest, BearsItsSeeds) {
-    const FuzzMaterial material = GetParam().material();
-    EXPECT_GE(material.seeds.size(), 4u);
-    for (std::size_t i = 0; i < material.seeds.size(); ++i) {
+TEST_P(FuzzTargetTest, AcceptsItsSeeds) {
+    const FuzzCorpus corpus = GetParam().corpus();
+    EXPECT_GE(corpus.seeds.size(), 4u);
+    for (std::size_t i = 0; i < corpus.seeds.size(); ++i) {
         SCOPED_TRACE("seed " + std::to_string(i + 1));
-        EXPECT_NO_THROW(target->run(material.seeds[i].bytes()));
+        EXPECT_NO_THROW(target->run(corpus.seeds[i].bytes()));
     }
 }
 
-TEST_P(FuzzTargetTest, BearsInputsThatEndAnywhere) {
-    const FuzzMaterial material = GetParam().material();
+TEST_P(FuzzTargetTest, AcceptsTruncatedInputs) {
+    const FuzzCorpus corpus = GetParam().corpus();
     const Bytes seed =
-        std::min_element(material.seeds.begin(), material.seeds.end(), [](const Data& a, const Data& b) {
+        std::min_element(corpus.seeds.begin(), corpus.seeds.end(), [](const Data& a, const Data& b) {
             return a.size() < b.size();
         })->bytes();
     for (std::size_t length = 0; length <= seed.size(); ++length) {
@@ -73,15 +73,15 @@ TEST_P(FuzzTargetTest, BearsInputsThatEndAnywhere) {
     }
 }
 
-TEST_P(FuzzTargetTest, HasTheSameMaterialEveryTime) {
-    const FuzzMaterial first = GetParam().material();
-    const FuzzMaterial second = GetParam().material();
+TEST_P(FuzzTargetTest, HasTheSameCorpusEveryTime) {
+    const FuzzCorpus first = GetParam().corpus();
+    const FuzzCorpus second = GetParam().corpus();
     EXPECT_EQ(first.seeds, second.seeds);
     EXPECT_EQ(first.tokens, second.tokens);
 }
 
 TEST_P(FuzzTargetTest, HasTokensThatFitTheEngine) {
-    for (const Data& token : GetParam().material().tokens) {
+    for (const Data& token : GetParam().corpus().tokens) {
         EXPECT_GE(token.size(), 1u);
         EXPECT_LE(token.size(), 64u);
     }

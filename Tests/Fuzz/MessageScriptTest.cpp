@@ -31,7 +31,7 @@ TEST_P(MessageScriptStepTest, GivesItsStep) {
     EXPECT_FALSE(script.next());
 }
 
-// The length field is that of all bytes behind the type: 12 and the payload.
+// The length field counts all bytes after the type: 12 and the payload.
 constexpr StepCase steps[] = {
     {"Baseband", "00 3412 0200 AABB", "01 0E00 3412 0000000000000000 AABB"},
     {"Extra", "01 0100 0100 AA", "FF 0D00 0100 0000000000000000 AA"},
@@ -52,7 +52,7 @@ TEST(MessageScriptTest, IsAtItsEndWhenEmpty) {
     EXPECT_FALSE(MessageScript({}).next());
 }
 
-TEST(MessageScriptTest, GoesOnBehindAStep) {
+TEST(MessageScriptTest, ContinuesAfterAStep) {
     const Data bytes = hex("03 0100 AA  04  03 0100 BB");
     MessageScript script(bytes.bytes());
     EXPECT_EQ(script.next()->message, hex("AA"));

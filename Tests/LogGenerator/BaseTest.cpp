@@ -67,7 +67,7 @@ TEST(BaseTest, RegistersUnderItsNameAndEachCode) {
     EXPECT_THAT(log.lines(), ElementsAre(CapturedLog::Line{LogPriority::Warning, "Array Count: 2"}));
 }
 
-TEST(BaseTest, SubscribersStandInTheOrderOfTheirRegistration) {
+TEST(BaseTest, SubscribersAreInOrderOfRegistration) {
     ClassDictionary classes;
     CodeDictionary codes;
     Probe second("B", {7});

@@ -46,7 +46,7 @@ public:
     Held<SimInfo> sim{*this};
 };
 
-TEST(ClassIndexTest, NobodyWantsAnotherCodeHoweverFewThereAre) {
+TEST(ClassIndexTest, OtherCodesHaveNoSubscribersEvenInAFullTable) {
     const ClassIndex none;
     EXPECT_THAT(none.getSubscribers(0), IsNull());
     EXPECT_THAT(none.getSubscribers(0xFF0000), IsNull());
@@ -56,7 +56,7 @@ TEST(ClassIndexTest, NobodyWantsAnotherCodeHoweverFewThereAre) {
         EXPECT_THAT(one.getSubscribers(code), IsNull());
 }
 
-TEST(ClassIndexTest, CodesThatComeLaterAreRouted) {
+TEST(ClassIndexTest, CodesAddedLaterAreRouted) {
     SingleIndex index;
     EXPECT_THAT(index.getSubscribers(0x1234), IsNull());
     index.codeDictionary["4660"].push_back(index.sim.get());

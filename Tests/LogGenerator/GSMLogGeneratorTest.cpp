@@ -6,7 +6,7 @@
 #include "LogGenerator/GSM/AssertionFailure.h"
 #include "PropertyLists/PropertyList.h"
 #include "Tests/Support/FakeClock.h"
-#include "Tests/Support/NotedEffects.h"
+#include "Tests/Support/RecordedEffects.h"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
@@ -86,7 +86,7 @@ struct Foreign {
 
 class ForeignKindTest : public testing::TestWithParam<Foreign> {};
 
-TEST_P(ForeignKindTest, IsAnAssertionFailureWhereverItStands) {
+TEST_P(ForeignKindTest, IsAnAssertionFailureAtAnyDepth) {
     const Value& value = GetParam().value;
     const std::string wanted = std::string("Unknown object of type ") + GetParam().kind +
                                " encountered (LogGenerator/GSM/GSMLogGenerator:78)";
@@ -130,10 +130,10 @@ TEST_F(GSMLogGeneratorTest, EachMessageReplacesTheWholeDisplay) {
 }
 
 TEST_F(GSMLogGeneratorTest, MessageConcernsTheWholeDisplay) {
-    NotedEffects effects;
+    RecordedEffects effects;
     generator.updateStateTelling(state, Data(*writeBinaryPropertyList(dictionary({{"Band", "900"}}))),
                                  effects);
-    EXPECT_EQ(effects.kind, NotedEffects::Kind::Display);
+    EXPECT_EQ(effects.kind, RecordedEffects::Kind::Display);
     EXPECT_EQ(effects.messages, 1);
     ASSERT_EQ(effects.members.size(), 1U);
     EXPECT_EQ(effects.members[0].second.asDictionary(), state["Display"].asDictionary());
@@ -154,7 +154,7 @@ TEST_F(GSMLogGeneratorTest, ARootThatIsNoDictionaryIsTheDisplayAllTheSame) {
     EXPECT_EQ(state["Display"], Value("text"));
 }
 
-TEST_F(GSMLogGeneratorTest, ExtraInfoIsMadeAnewByEveryMessage) {
+TEST_F(GSMLogGeneratorTest, EveryMessageReplacesExtraInfo) {
     update(dictionary({{"A", "1"}}));
     state["ExtraInfo"].asDictionary()->set("Rate", "1");
     update(dictionary({{"A", "1"}}));
@@ -228,7 +228,7 @@ TEST_F(GSMLogGeneratorTest, UnreadableMessageIsAnAssertionFailure) {
     EXPECT_TRUE(state.empty());
 }
 
-TEST_F(GSMLogGeneratorTest, BothAssertionFailuresEndTheProgramWithTheirWords) {
+TEST_F(GSMLogGeneratorTest, BothAssertionFailuresEndTheProgramWithTheirMessage) {
     EXPECT_DEATH([this]() noexcept { generator.updateState(state, Data()); }(),
                  "Could not deserialize the object \\(LogGenerator/GSM/GSMLogGenerator:90\\)");
     EXPECT_DEATH([]() noexcept { static_cast<void>(GSMLogGenerator::processObject(7)); }(),

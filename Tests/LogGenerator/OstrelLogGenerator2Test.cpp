@@ -7,7 +7,7 @@
 #include "Tests/Support/FakeClock.h"
 #include "Tests/Support/FakeResources.h"
 #include "Tests/Support/Hex.h"
-#include "Tests/Support/NotedEffects.h"
+#include "Tests/Support/RecordedEffects.h"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
@@ -123,16 +123,16 @@ std::vector<std::uint32_t> codesOf(const Listener& section) {
     return codes;
 }
 
-TEST_P(FramingTest, TellingOfItDoesTheSame) {
+TEST_P(FramingTest, ReportingDoesTheSame) {
     log.clear();
     const Data message = hex(GetParam().bytes);
-    NotedEffects effects;
+    RecordedEffects effects;
     generator.updateStateTelling(state, message, effects);
     EXPECT_EQ(codesOf(index->baseband), GetParam().basebandCodes);
     EXPECT_EQ(codesOf(index->extra), GetParam().extraCodes);
     EXPECT_EQ(log.textsAt(LogPriority::Error), GetParam().errors);
     EXPECT_EQ(raw(), message);
-    EXPECT_EQ(effects.kind, NotedEffects::Kind::Sections);
+    EXPECT_EQ(effects.kind, RecordedEffects::Kind::Sections);
     EXPECT_EQ(effects.messages, 1);
     for (const std::vector<std::uint32_t>& codes : {GetParam().basebandCodes, GetParam().extraCodes})
         if (!codes.empty()) {
@@ -143,8 +143,8 @@ TEST_P(FramingTest, TellingOfItDoesTheSame) {
     }
 }
 
-TEST_F(TemplateTest, SectionsOfACodeAreToldWithTheirNodesAsTheyThenStand) {
-    NotedEffects effects;
+TEST_F(TemplateTest, SectionsOfACodeAreReportedWithTheirUpdatedNodes) {
+    RecordedEffects effects;
     generator.updateStateTelling(state, record(0x1234, "00 00"), effects);
     EXPECT_EQ(effects.code, 0x1234U);
     ASSERT_EQ(effects.members.size(), 2U);
@@ -160,7 +160,7 @@ TEST_F(TemplateTest, SectionsOfACodeAreToldWithTheirNodesAsTheyThenStand) {
     ASSERT_EQ(effects.members.size(), 1U);
     EXPECT_EQ(effects.members[0].first, "SIM Info");
 
-    generator.updateStateTelling(state, record(0x1235, ""), effects); // nobody wants it
+    generator.updateStateTelling(state, record(0x1235, ""), effects); // it has no subscriber
     EXPECT_EQ(effects.code, 0x1235U);
     EXPECT_THAT(effects.members, IsEmpty());
     generator.updateStateTelling(state, hex("01 02"), effects);
@@ -168,7 +168,7 @@ TEST_F(TemplateTest, SectionsOfACodeAreToldWithTheirNodesAsTheyThenStand) {
     EXPECT_THAT(effects.members, IsEmpty());
 }
 
-TEST_F(TemplateTest, SectionOfACodeListedTwiceIsToldOnceAndOneWithoutANodeIsNot) {
+TEST_F(TemplateTest, SectionOfADuplicateCodeIsReportedOnceAndOneWithoutANodeIsNot) {
     class OddIndex final : public ClassIndex {
     public:
         OddIndex() {
@@ -180,7 +180,7 @@ TEST_F(TemplateTest, SectionOfACodeListedTwiceIsToldOnceAndOneWithoutANodeIsNot)
     };
     const auto odd = std::make_shared<OddIndex>();
     OstrelLogGenerator2 other("Probe", odd, clock);
-    NotedEffects effects;
+    RecordedEffects effects;
     Dictionary fresh;
     other.updateStateTelling(fresh, record(0x1234, ""), effects);
     EXPECT_EQ(odd->twice.calls.size(), 2U);
@@ -355,7 +355,7 @@ TEST_F(TemplateTest, WalkReportsForeignKindsAtAnyDepthAndNothingElse) {
                             CapturedLog::Line{LogPriority::Error, "Received an object of unknown type"}));
 }
 
-TEST_F(TemplateTest, RefreshHandsOverTheRawMessagesAndStartsAnew) {
+TEST_F(TemplateTest, RefreshMovesTheRawMessagesOut) {
     update(hex("AA"));
     update(hex("BB CC"));
     const Value shown = generator.generateLogUsingState(state);
@@ -391,7 +391,7 @@ TEST_F(TemplateTest, StartCommandSplitsTheCodes) {
     EXPECT_THAT(numbers("SetVoxExtraCodes"), UnorderedElementsAre(0, 2));
 }
 
-TEST_F(TemplateTest, NewDecoderGoesOnInTheDisplayOfTheEarlierOne) {
+TEST_F(TemplateTest, NewDecoderContinuesWithTheDisplay) {
     update(record(0xD0E0, "01 02"));
     const Dictionary* shown = &display();
     const auto nextIndex = std::make_shared<ListenerIndex>();

@@ -46,7 +46,7 @@ protected:
     Dictionary state = {{"History", history}};
 };
 
-TEST_F(DLFTest, RawMaterialWithoutAMessageAddsNothing) {
+TEST_F(DLFTest, EmptyRawMessagesAddNothing) {
     const Data empty = dlf();
     addToHistory(Data());
     EXPECT_EQ(dlf(), empty);
@@ -85,7 +85,7 @@ TEST_F(DLFTest, MissingHistoryIsTheSame) {
     EXPECT_EQ(dlf().size(), 161u);
 }
 
-TEST_F(DLFTest, UnknownVersionSaysSo) {
+TEST_F(DLFTest, UnknownVersionIsNamedAsSuch) {
     resources.version = std::nullopt;
     const Data log = dlf();
     EXPECT_EQ(std::string(log.bytes().begin() + 16, log.bytes().begin() + 23), std::string("(none)\0", 7));
@@ -106,15 +106,15 @@ TEST_F(DLFTest, ZoneMinutesAreCutTowardZero) {
     EXPECT_EQ(dlf().bytes()[86], 0xFF);
 }
 
-TEST_F(DLFTest, OnlyTheFirstByteOfEachBufferGoes) {
+TEST_F(DLFTest, OnlyTheFirstByteOfEachBufferIsRemoved) {
     addToHistory(hex("01 AA BB 01 CC")); // two messages: the second keeps its type byte
     addToHistory(hex("01"));             // too short to hold anything
     addToHistory(hex("01 DD"));
-    history->append(makeDictionary()); // without raw material
+    history->append(makeDictionary()); // without raw messages
     EXPECT_EQ(dlf().from(161), hex("AA BB 01 CC DD"));
 }
 
-TEST_F(DLFTest, RawMaterialOfAnotherKindAbortsTheLog) {
+TEST_F(DLFTest, RawMessagesOfAnotherKindAbortTheLog) {
     addToHistory(hex("01 AA"));
     addToHistory("text");
     const CapturedLog log;
@@ -161,7 +161,7 @@ TEST(DLFAddVersionReportTest, ShortBufferGetsNothing) {
     EXPECT_THAT(buffer, Each(0));
 }
 
-TEST(DLFAddVersionReportTest, LongerBufferIsLeftAloneBehindTheReport) {
+TEST(DLFAddVersionReportTest, ALongerBufferIsUnchangedAfterTheReport) {
     std::array<std::uint8_t, 162> buffer{};
     buffer[160] = buffer[161] = 0xEE;
     std::size_t written = 0;

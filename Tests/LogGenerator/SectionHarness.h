@@ -74,7 +74,7 @@ SectionHarness inArray() {
 
 /// The record with one byte changed. Precondition: the offset lies inside.
 [[nodiscard]] Data withByte(const Data& record, std::size_t offset, std::uint8_t value);
-/// The first bytes of the record in a buffer of just that size, so that a read behind them is found out.
+/// The first bytes of the record in a buffer of just that size, so that a read past their end is detected.
 [[nodiscard]] Data prefixOf(const Data& record, std::size_t length);
 /// A record of `length` bytes whose payload is zero but for the bytes given by offset.
 struct ByteAt {

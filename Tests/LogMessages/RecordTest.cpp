@@ -55,7 +55,7 @@ struct Holding {
 
 class CountedListSizeTest : public testing::TestWithParam<Holding> {};
 
-TEST_P(CountedListSizeTest, KnowsHowManyEntriesLieInside) {
+TEST_P(CountedListSizeTest, CountsCompleteEntries) {
     const std::vector<std::uint8_t> bytes(GetParam().size);
     const CountedList list(Record(Bytes(bytes)), 4, 3, GetParam().count); // three bytes each, from 4 on
     EXPECT_EQ(list.count(), GetParam().count);

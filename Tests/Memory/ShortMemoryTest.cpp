@@ -61,8 +61,8 @@ Value textsOf(int number) {
     return node;
 }
 
-/// Runs `operation` on a fresh `make()` with each of its allocations failing in turn, checks
-/// with `expectWhole` what that has left, and runs it once more. Returns how many allocations there are.
+/// Runs `operation` on a fresh `make()` with each of its allocations failing, one after another, checks with
+/// `expectWhole` what that has left, and runs it once more. Returns how many allocations there are.
 std::uint64_t failEach(const std::function<Value()>& make, const std::function<void(const Value&)>& operation,
                        const std::function<void(const Value&)>& expectWhole, const Value& result) {
     for (std::uint64_t failing = 1;; ++failing) {
@@ -156,7 +156,7 @@ TEST(ShortMemoryTest, ARecordThatCannotBeWrittenYetIsWrittenAtTheNextAttempt) {
     EXPECT_GT(failEach(make, write, expectNothing, textsOf(123)), 0u);
 }
 
-TEST(ShortMemoryTest, ACopyIsWholeOrNotMade) {
+TEST(ShortMemoryTest, ACopyIsCompleteOrNotMade) {
     Value copy;
     const auto make = [&copy] {
         const DictionaryRef node = makeDictionary();

@@ -22,7 +22,7 @@
 namespace velmora {
 namespace {
 
-/// Takes the lines that are wanted at the level programs start with, and keeps none.
+/// Accepts the lines of the programs' default level, and keeps none.
 class ForgetfulLog final : public SystemLog {
 public:
     ForgetfulLog()

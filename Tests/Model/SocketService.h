@@ -9,11 +9,11 @@
 namespace velmora {
 
 /// A telephony service in a process of its own, over real sockets in `directory`. It answers "GetTechnology"
-/// as `manner` says and, once it is told to stream, sends a registration record every 20 ms. Killed in the
-/// end.
+/// as `manner` says and, once it gets the start command, sends a registration record every 20 ms. Killed in
+/// the end.
 ///
 /// Manners: "normal"; "late", after the time that the application waits; "rubbish"; "unknown", a technology
-/// that nobody decodes; "no-answer", a dictionary without one; "no-data", a reply without data.
+/// without a decoder; "no-answer", a dictionary without one; "no-data", a reply without data.
 class SocketService {
 public:
     SocketService(const std::string& directory, const std::string& manner);

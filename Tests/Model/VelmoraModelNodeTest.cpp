@@ -12,7 +12,7 @@
 
 namespace velmora {
 
-/// Looks at the mutex behind the lock from another thread, and gives back what the lock keeps on purpose.
+/// Inspects the lock's mutex from another thread, and releases what the lock keeps by design.
 class ArrayLockProbe {
 public:
     static bool isHeldElsewhere() {
@@ -137,7 +137,7 @@ TEST(VelmoraModelNodeTest, SortedDictionaryOrdersByBytesAndShowsWhatFollowsTheSe
     EXPECT_EQ(*root->childNodes()->front()->value(), "first");
 }
 
-TEST(VelmoraModelNodeTest, OfSiblingsWithOneNameTheLaterKeepsThePath) {
+TEST(VelmoraModelNodeTest, TheLastSiblingOfANameHasThePath) {
     PathDictionary byPath;
     const NodeRef root = VelmoraModelNode::makeTreeFromObject(
         dictionary({{"_sorted", ""}, {"2;40", "later"}, {"1;40", "earlier"}}), byPath);

@@ -169,7 +169,7 @@ TEST_F(VelmoraModelRunTest, ClosingThePortsKeepsDecoderStateAndTree) {
     EXPECT_EQ(model->topLevelNodes(), root);
 }
 
-TEST_F(VelmoraModelRunTest, ReconnectionWithoutAnAnswerGoesOnWithTheEarlierDecoder) {
+TEST_F(VelmoraModelRunTest, ReconnectionWithoutAnAnswerKeepsTheDecoder) {
     const LogGenerator* decoder = model->logGenerator();
     getTechnology = [](const Data&) { return RemotePort::Answer{PortStatus::Success, std::nullopt}; };
     model->restartMonitor();
@@ -208,7 +208,7 @@ TEST_F(VelmoraModelRunTest, ServersCallbackRefreshes) {
     EXPECT_EQ(redraws, 1);
 }
 
-TEST_F(VelmoraModelRunTest, NothingRefersToAModelThatIsGone) {
+TEST_F(VelmoraModelRunTest, NothingRefersToADestroyedModel) {
     deliver(idleRecord());
     model->refresh();
     model.reset();

@@ -125,7 +125,7 @@ TEST_F(LinuxFileSystemTest, ReplacingPutsANewFileWithTheOldOnesPermissionsInItsP
     EXPECT_EQ(content("list"), "two");
     EXPECT_EQ(content("old"), "one");
     EXPECT_EQ(std::filesystem::status(path).permissions(), std::filesystem::perms(0640));
-    EXPECT_THAT(names(), testing::UnorderedElementsAre("list", "old")); // no draft is left
+    EXPECT_THAT(names(), testing::UnorderedElementsAre("list", "old")); // no temporary file is left
 }
 
 TEST_F(LinuxFileSystemTest, ReplacingThatFailsLeavesNoDraft) {

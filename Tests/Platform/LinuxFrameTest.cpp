@@ -99,7 +99,7 @@ TEST(LinuxFrame, BytesOneByOneGiveTheirFrames) {
     expectTwoFrames(frames);
 }
 
-TEST(LinuxFrame, TheLongestFrameArrivesWhole) {
+TEST(LinuxFrame, TheLongestFrameArrivesCompletely) {
     Frame frame;
     std::vector<std::uint8_t> payload(maximumFramePayload);
     payload.front() = 1;
@@ -230,8 +230,8 @@ TEST_F(LinuxFrameQueue, APartlyWrittenFrameIsNeverDropped) {
     EXPECT_EQ(queue.push(frameOf(2, 10)), 0U);
     EXPECT_EQ(queue.push(frameOf(3, 10)), 1U); // 2 goes
     EXPECT_EQ(queue.push(frameOf(4, 10)), 1U); // 3 goes
-    EXPECT_TRUE(queue.withdrawNewest());
-    EXPECT_FALSE(queue.withdrawNewest()); // 1 is on its way
+    EXPECT_TRUE(queue.removeNewest());
+    EXPECT_FALSE(queue.removeNewest()); // 1 is on its way
     EXPECT_EQ(queue.push(frameOf(5, 10)), 0U);
     std::vector<std::int32_t> ids;
     while (!queue.empty()) {

@@ -48,7 +48,7 @@ TEST(MachineClock, IsTheSystemsClock) {
     EXPECT_LE(now, time_point_cast<nanoseconds>(system_clock::now()));
 }
 
-TEST(MachineClock, KnowsWinterAndSummer) {
+TEST(MachineClock, FollowsDaylightSavingTime) {
     const ZoneSetting zone(centralEurope);
     const MachineClock clock;
     const ZoneState winter = clock.zoneAt(sys_days{year{2026} / 11 / 16});

@@ -18,7 +18,7 @@
 namespace velmora {
 
 bool eventually(const std::function<bool()>& condition) {
-    // What the condition looks at may happen in another thread or process, which wakes nobody here.
+    // The condition may change in another thread or process, which does not wake this one.
     LoopTimer look([] {});
     look.startRepeating(std::chrono::milliseconds(1));
     return testLoop().runUntil(condition, std::chrono::seconds(10));

@@ -43,7 +43,7 @@ constexpr auto noAnswer = [](LocalPort&, std::int32_t, const Data&) -> std::opti
     return std::nullopt;
 };
 
-TEST_F(LinuxPortTest, APortLeavesNothingBehind) {
+TEST_F(LinuxPortTest, APortRemovesItsFiles) {
     auto port = listening("one");
     EXPECT_THAT(files(), ElementsAre("one", "one.lock"));
     port->invalidate();
@@ -82,7 +82,7 @@ TEST_F(LinuxPortTest, ALostLockFileIsNotTheNextOwnersLoss) {
     ASSERT_TRUE(eventually([&] { return !_messages.empty(); }));
 }
 
-TEST_F(LinuxPortTest, AFileThatIsNoSocketIsLeftAlone) {
+TEST_F(LinuxPortTest, AFileThatIsNoSocketIsNotRemoved) {
     std::ofstream(path("one")) << "precious";
     const auto created = LinuxMessagePorts(_options).createLocal("one", noAnswer);
     EXPECT_FALSE(created.port);
@@ -153,7 +153,7 @@ TEST_F(LinuxPortTest, TheEnvironmentNamesTheDirectory) {
     }
 }
 
-TEST_F(LinuxPortTest, DirectoriesThatCannotBeUsedAreRefusedInClearWords) {
+TEST_F(LinuxPortTest, UnusableDirectoriesAreRefusedWithAReason) {
     std::ofstream(path("file")) << "x";
     std::filesystem::create_directory(path("open"));
     std::filesystem::permissions(path("open"), std::filesystem::perms(0777));

@@ -111,7 +111,7 @@ TEST_F(LinuxPortTest, AnOwnerThatIsStartedAgainAfterACrashIsWaitedFor) {
     EchoProcess crashed(_directory.path().string(), "echo");
     crashed.kill();
     EXPECT_FALSE(LinuxMessagePorts(_options).createRemote("echo")) << "not unless it is asked for";
-    _options.restartPatience = 10s;
+    _options.restartTimeout = 10s;
     std::optional<EchoProcess> again;
     std::thread starter([&] {
         std::this_thread::sleep_for(30ms); // by then it is waited for, most likely
@@ -124,11 +124,11 @@ TEST_F(LinuxPortTest, AnOwnerThatIsStartedAgainAfterACrashIsWaitedFor) {
 }
 
 TEST_F(LinuxPortTest, AnOwnerThatHasEndedOrStaysAwayIsNotWaitedForLonger) {
-    _options.restartPatience = 1h;
+    _options.restartTimeout = 1h;
     EXPECT_FALSE(LinuxMessagePorts(_options).createRemote("never")) << "no crash";
     EchoProcess crashed(_directory.path().string(), "echo");
     crashed.kill();
-    _options.restartPatience = 50ms;
+    _options.restartTimeout = 50ms;
     EXPECT_FALSE(LinuxMessagePorts(_options).createRemote("echo"));
     EXPECT_THAT(_log.lines(), IsEmpty());
 }

@@ -90,7 +90,7 @@ TEST_F(LinuxPreferencesTest, LinkStaysALink) {
     EXPECT_EQ(stored(), dictionary({{"Shown", true}}));
 }
 
-TEST_F(LinuxPreferencesTest, ListThatCannotBeReadIsLeftAloneAndTheValueKept) {
+TEST_F(LinuxPreferencesTest, AnUnreadableListIsNotChangedAndTheValueKept) {
     put(std::string("no list"));
     preferences.setBoolean(domain, "Shown", true);
     preferences.synchronize(domain);
@@ -121,7 +121,7 @@ TEST_F(LinuxPreferencesTest, DomainThatIsNoFileNameIsRefused) {
     EXPECT_TRUE(std::filesystem::is_empty(directory.path()));
 }
 
-TEST_F(LinuxPreferencesTest, WithoutABusNobodyIsTold) {
+TEST_F(LinuxPreferencesTest, WithoutABusNoChangeIsAnnounced) {
     LinuxPreferences alone(directory.path(), "unix:path=" + (directory / "none").string());
     alone.announceChange(domain, "Shown");
     EXPECT_THAT(log.lines(),

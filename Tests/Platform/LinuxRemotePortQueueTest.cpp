@@ -30,7 +30,7 @@ TEST_F(LinuxRemotePortQueueTest, WhatWasPostedLastIsNotLost) {
     EXPECT_EQ(readBlocking(_peer, 100), hex("00 00 00 00  01 00 00 00  04 00 00 00  00 00 00 00"));
 }
 
-TEST_F(LinuxRemotePortQueueTest, ASlowReaderLosesTheOldestMessagesWhichAreCounted) {
+TEST_F(LinuxRemotePortQueueTest, TheOldestMessagesOfASlowReaderAreDroppedAndCounted) {
     _options.queue.messages = 4;
     auto port = connected();
     const Data payload(std::vector<std::uint8_t>(50'000));

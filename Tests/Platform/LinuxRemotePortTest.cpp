@@ -102,7 +102,7 @@ TEST_F(LinuxRemotePortTest, AMessageThatIsTooLongCannotBeSent) {
     EXPECT_TRUE(port->isValid());
 }
 
-TEST_F(LinuxRemotePortTest, APeerThatGoesWhileItsAnswerIsAwaitedEndsTheRequest) {
+TEST_F(LinuxRemotePortTest, APeerThatClosesDuringARequestEndsIt) {
     const auto port = connected();
     int invalidated = 0;
     port->setInvalidationCallback([&](RemotePort&) { ++invalidated; });
@@ -145,7 +145,7 @@ TEST_F(LinuxRemotePortTest, TheEventLoopSeesADeadPeer) {
     EXPECT_EQ(seen, raw);
 }
 
-TEST_F(LinuxRemotePortTest, InvalidateCallsBackOnceAndNotWhenTheCallbackIsGone) {
+TEST_F(LinuxRemotePortTest, InvalidateCallsBackOnceAndNotWithoutACallback) {
     auto port = connected();
     int invalidated = 0;
     port->setInvalidationCallback([&](RemotePort& invalid) {
@@ -211,7 +211,7 @@ TEST_F(LinuxRemotePortTest, APeerThatSendsOtherThingsDoesNotStretchTheTime) {
 
 TEST_F(LinuxRemotePortTest, AnAbsentPeerIsNoErrorAndAForeignOneIs) {
     EXPECT_FALSE(LinuxMessagePorts(_options).createRemote("nobody"));
-    _server.reset(); // as a crash leaves it: a socket that nobody listens on
+    _server.reset(); // as a crash leaves it: a socket without a listener
     EXPECT_FALSE(LinuxMessagePorts(_options).createRemote("peer"));
     EXPECT_THAT(_log.lines(), IsEmpty());
 

@@ -59,7 +59,7 @@ TEST_F(LinuxResourcesTest, AFailureNamesThePlaces) {
     }
 }
 
-TEST_F(LinuxResourcesTest, AResourceThatCannotBeReadIsNotPassedOver) {
+TEST_F(LinuxResourcesTest, AnUnreadableResourceIsNotSkipped) {
     std::filesystem::create_directory(_first / "LTE.plist");
     put(_second / "LTE.plist", "installed");
     const auto result = _resources.read("LTE", "plist");
@@ -78,7 +78,7 @@ TEST_F(LinuxResourcesTest, NamesAreListedOnceAndSorted) {
     EXPECT_THAT(_resources.list("txt"), IsEmpty());
 }
 
-TEST_F(LinuxResourcesTest, TheStandardPlacesStandInTheirOrder) {
+TEST_F(LinuxResourcesTest, TheStandardDirectoriesAreInOrder) {
     ::setenv("VELMORA_RESOURCES", "/own", 1);
     ::setenv("XDG_CONFIG_HOME", "/config", 1);
     auto places = FileResources::standardDirectories();
@@ -97,7 +97,7 @@ TEST_F(LinuxResourcesTest, TheStandardPlacesStandInTheirOrder) {
     EXPECT_EQ(std::count(places.begin(), places.end(), places[0]), 1);
 }
 
-TEST_F(LinuxResourcesTest, TheProgramKnowsItsVersionAndItsBuild) {
+TEST_F(LinuxResourcesTest, TheProgramHasItsVersionAndBuildStamp) {
     ASSERT_TRUE(_resources.bundleVersion());
     EXPECT_THAT(*_resources.bundleVersion(), MatchesRegex("[0-9]+\\.[0-9]+\\.[0-9]+"));
     EXPECT_THAT(

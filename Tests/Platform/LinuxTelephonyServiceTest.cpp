@@ -96,17 +96,17 @@ TEST_F(LinuxTelephonyServiceTest, AnswersWithoutANameGiveNone) {
     EXPECT_EQ(channel(Value(number)), (Outcome{0, 0, ""}));
 }
 
-TEST_F(LinuxTelephonyServiceTest, TheConnectionTellsWhenTheServiceGoes) {
+TEST_F(LinuxTelephonyServiceTest, TheConnectionReportsALostService) {
     _ports.serve("com.velmora.vox.server",
                  [](std::int32_t, const Data&, bool) { return RemotePort::Answer(); });
-    int told = 0;
-    auto connection = _service._VoxServerConnectionCreate([&] { ++told; });
+    int closed = 0;
+    auto connection = _service._VoxServerConnectionCreate([&] { ++closed; });
     _ports.sever("com.velmora.vox.server");
-    EXPECT_EQ(told, 1);
-    connection = _service._VoxServerConnectionCreate([&] { ++told; });
+    EXPECT_EQ(closed, 1);
+    connection = _service._VoxServerConnectionCreate([&] { ++closed; });
     connection.reset();
     _ports.sever("com.velmora.vox.server");
-    EXPECT_EQ(told, 1);
+    EXPECT_EQ(closed, 1);
 }
 
 } // namespace

@@ -15,7 +15,7 @@ namespace {
 using testing::ElementsAre;
 using Line = CapturedLog::Line;
 
-TEST(SystemLog, WritesTextAsItStands) {
+TEST(SystemLog, WritesTextUnchanged) {
     CapturedLog log;
     logLine(LogPriority::Error, "100 %s, no format\n");
     logLine(LogPriority::Info, "");
@@ -40,8 +40,8 @@ TEST(SystemLog, LeavesOutWhatIsAboveTheLevel) {
     for (const Line& line : log.lines())
         texts.push_back(line.text);
     EXPECT_THAT(texts, ElementsAre("0", "1", "2", "3", "4"));
-    EXPECT_TRUE(systemLogWants(LogPriority::Warning));
-    EXPECT_FALSE(systemLogWants(LogPriority::Notice));
+    EXPECT_TRUE(isLogged(LogPriority::Warning));
+    EXPECT_FALSE(isLogged(LogPriority::Notice));
 }
 
 TEST(SystemLog, LooksAtThePriorityWithoutTheFacility) {
@@ -55,7 +55,7 @@ TEST(SystemLog, IsNowhereUntilOneIsSet) {
     CapturedLog log;
     SystemLog* earlier = setSystemLog(nullptr);
     EXPECT_EQ(earlier, &log);
-    EXPECT_FALSE(systemLogWants(LogPriority::Emergency));
+    EXPECT_FALSE(isLogged(LogPriority::Emergency));
     logLine(LogPriority::Emergency, "lost");
     EXPECT_EQ(setSystemLog(&log), nullptr);
     logLine(LogPriority::Emergency, "kept");

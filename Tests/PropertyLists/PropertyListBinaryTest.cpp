@@ -72,7 +72,7 @@ TEST(BinaryReader, ReadsContainersInOrder) {
     EXPECT_EQ(value->asDictionary()->begin()->key, "b");
 }
 
-TEST(BinaryReader, ObjectsBehindTwoReferencesAreIndependent) {
+TEST(BinaryReader, ObjectsReferencedTwiceAreIndependent) {
     const auto value = readPropertyList(listOf({hex("A2 00000001 00000001"), hex("A0")}));
     ASSERT_TRUE(value) << value.reason();
     const Array& array = *value->asArray();
@@ -88,7 +88,7 @@ struct Bad {
 
 class BinaryBad : public testing::TestWithParam<Bad> {};
 
-// The object stands at offset 8 and the table right behind it.
+// The object is at offset 8 and the table right after it.
 TEST_P(BinaryBad, IsRefusedWithAReason) {
     EXPECT_EQ(reasonOf(listOf({hex(GetParam().hexText)})), GetParam().reason);
 }
@@ -141,7 +141,7 @@ const Bad badObjects[] = {
 INSTANTIATE_TEST_SUITE_P(Objects, BinaryBad, testing::ValuesIn(badObjects),
                          [](const auto& parameter) { return parameter.param.name; });
 
-TEST(BinaryReader, WantsStringsAsKeys) {
+TEST(BinaryReader, NeedsStringKeys) {
     EXPECT_EQ(reasonOf(listOf({hex("D1 00000001 00000001"), hex("10 01")})),
               "offset 9: a dictionary's key is of the kind integer, not string");
 }
@@ -188,7 +188,7 @@ TEST(BinaryReader, ChecksEveryOffset) {
     EXPECT_EQ(reasonOf(listOf({Data()})), "offset 8: object 0 lies at 8, not from 8 to 7");
 }
 
-TEST(BinaryReader, WantsItsHeaderAndItsTrailer) {
+TEST(BinaryReader, NeedsHeaderAndTrailer) {
     EXPECT_EQ(reasonOf(bytesOf("bplist00")),
               "the list has 8 bytes, fewer than the 40 of a header and a trailer");
     Buffer list = listOf({hex("10 01")});

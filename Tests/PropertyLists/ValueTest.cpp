@@ -22,7 +22,7 @@ std::vector<std::string> keysOf(const Dictionary& dictionary) {
     return keys;
 }
 
-TEST(Value, KnowsItsKindAndConvertsNothing) {
+TEST(Value, HasItsKindAndConvertsNothing) {
     const struct {
         Value value;
         Kind kind;

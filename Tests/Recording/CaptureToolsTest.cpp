@@ -1,8 +1,8 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Recording/Pcapng/RecordingReader.h"
-#include "Recording/Pcapng/RecordingWriter.h"
+#include "Recording/Pcapng/PcapngReader.h"
+#include "Recording/Pcapng/PcapngWriter.h"
 #include "Tests/Recording/PcapngFile.h"
 #include "Tests/Support/ShellCommand.h"
 #include "Tests/Support/TemporaryDirectory.h"
@@ -27,7 +27,7 @@ protected:
                                      std::int64_t firstNanosecond,
                                      const std::vector<const char*>& messages) const {
         std::string path = _directory / name;
-        auto writer = RecordingWriter::create(path, technology);
+        auto writer = PcapngWriter::create(path, technology);
         EXPECT_TRUE(writer);
         for (const char* const message : messages) {
             EXPECT_TRUE(
@@ -42,7 +42,7 @@ protected:
     [[nodiscard]] static std::vector<std::string> messagesOf(const std::string& path,
                                                              std::uint64_t losses = 0) {
         std::vector<std::string> texts;
-        auto reader = RecordingReader::open(path);
+        auto reader = PcapngReader::open(path);
         EXPECT_TRUE(reader) << reader.reason();
         while (const auto message = (*reader)->next())
             texts.push_back(std::to_string(message->number) + ", " +
@@ -88,7 +88,7 @@ TEST_F(CaptureTools, cutARecording) {
     const std::string cut = _directory / "cut.pcapng";
     ASSERT_EQ(runShell("editcap -r " + path + " " + cut + " 2-3").status, 0);
     EXPECT_THAT(messagesOf(cut), ElementsAre("1, 1000000005 ns: 02", "2, 2000000005 ns: 03"));
-    EXPECT_EQ((*RecordingReader::open(cut))->technology(), "Ostrel_LTE");
+    EXPECT_EQ((*PcapngReader::open(cut))->technology(), "Ostrel_LTE");
 }
 
 TEST_F(CaptureTools, shortenMessagesWhichAreThenLost) {

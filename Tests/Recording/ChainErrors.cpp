@@ -19,7 +19,7 @@ namespace {
 constexpr std::size_t runLength = 40;
 constexpr std::size_t bufferLength = 8; ///< messages of one of the application's buffers
 
-/// A record and where its bytes stand.
+/// A record and the offset of its bytes.
 struct Placed {
     std::size_t begin;
     std::size_t end;
@@ -65,7 +65,7 @@ Chain chainOf(std::span<const Data> messages, ChainForm form) {
     return chain;
 }
 
-/// Bytes [at, at + removed) give way to `inserted` others.
+/// Bytes [at, at + removed) are replaced by `inserted` others.
 struct Edit {
     std::size_t at = 0;
     std::size_t removed = 0;
@@ -126,7 +126,7 @@ static ChainErrors measureOne(Chain chain, ChainForm form, ChainDamage damage, c
                        edit.inserted.begin(), edit.inserted.end());
 
     std::map<std::uint64_t, Data> untouched;
-    std::set<std::uint64_t> touched; // where the beginning of a damaged record still stands
+    std::set<std::uint64_t> touched; // where the beginning of a damaged record still is
     for (const Placed& record : chain.records) {
         if (!touches(edit, record))
             untouched.emplace(after(edit, record.begin), record.message);

@@ -13,7 +13,7 @@
 #include <vector>
 
 /// Measures how well a RecordChain finds records in damaged bytes: writes messages as a chain, spoils some
-/// bytes, reads the chain and compares what it gives with what was written.
+/// bytes, reads the chain and compares its records with those written.
 
 namespace velmora {
 

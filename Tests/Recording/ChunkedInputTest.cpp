@@ -15,7 +15,7 @@
 namespace velmora {
 namespace {
 
-/// 32-bit little-endian numbers from 0 on, so that every place can be told from its content.
+/// 32-bit little-endian numbers from 0 on, so that every offset can be recognised by its content.
 Data counting(std::size_t words) {
     std::vector<std::uint8_t> bytes;
     for (std::size_t i = 0; i < words; ++i) {
@@ -27,9 +27,9 @@ Data counting(std::size_t words) {
 
 constexpr std::size_t smallChunk = 8192;
 
-class ChunkedInputPieces : public testing::TestWithParam<std::size_t> {};
+class ChunkedInputReads : public testing::TestWithParam<std::size_t> {};
 
-TEST_P(ChunkedInputPieces, keepPartsGoodWhileTheInputMovesOn) {
+TEST_P(ChunkedInputReads, keepPartsValidWhileTheInputAdvances) {
     const Data content = counting(20'000);
     ChunkedInput input(std::make_unique<MemorySource>(content, GetParam()), smallChunk);
     std::vector<Data> parts;
@@ -46,9 +46,9 @@ TEST_P(ChunkedInputPieces, keepPartsGoodWhileTheInputMovesOn) {
     EXPECT_FALSE(input.failure());
 }
 
-INSTANTIATE_TEST_SUITE_P(Sizes, ChunkedInputPieces, testing::Values(1, 5, 4096, SIZE_MAX));
+INSTANTIATE_TEST_SUITE_P(Sizes, ChunkedInputReads, testing::Values(1, 5, 4096, SIZE_MAX));
 
-TEST(ChunkedInput, usesAChunkAgainThatNobodyHolds) {
+TEST(ChunkedInput, reusesAnUnreferencedChunk) {
     ChunkedInput input(std::make_unique<MemorySource>(counting(20'000)), smallChunk);
     ASSERT_TRUE(input.ensure(4));
     const std::uint8_t* const chunk = input.available().data();
@@ -84,7 +84,7 @@ TEST(ChunkedInput, growsForALongLookAheadAndShrinksAfterIt) {
     EXPECT_EQ(input.offset(), 400'000U);
 }
 
-TEST(ChunkedInput, tellsAReadErrorWithItsOffset) {
+TEST(ChunkedInput, reportsAReadErrorWithItsOffset) {
     ChunkedInput input(std::make_unique<MemorySource>(counting(100), SIZE_MAX, 10));
     ASSERT_TRUE(input.ensure(4));
     input.skip(4);
@@ -111,7 +111,7 @@ TEST(ChunkedInput, ofNothingHasNothing) {
     EXPECT_FALSE(input.failure());
 }
 
-/// Memory that tells how much room it was given to read into.
+/// A memory source that records the largest buffer that it was given.
 class WatchedSource final : public ByteSource {
 public:
     WatchedSource(Data data, std::size_t& mostRoom) : _memory(std::move(data)), _mostRoom(mostRoom) {}

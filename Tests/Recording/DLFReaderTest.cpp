@@ -52,7 +52,7 @@ TEST(DLFReader, takesLogsWithoutVersionReport) {
     EXPECT_EQ(out.technology, "Ostrel_LTE");
 }
 
-TEST(DLFReader, stampsThatAreNoTimeStandForTheLastOne) {
+TEST(DLFReader, invalidStampsTakeThePreviousTime) {
     const std::uint64_t none = stampAfter(7) | 0xFFFF;
     const auto timesOf = [](const Data& file) {
         std::vector<std::string> times;
@@ -92,7 +92,7 @@ const std::vector<std::string> fourTexts{
     "5 at 208, 1794805200003750000 ns: 0110002C51000043329B74130104000100",
 };
 
-TEST(DLFReader, cutOffAtAnyByteOfTheLastTwoRecordsLosesOnlyWhatIsCut) {
+TEST(DLFReader, truncationInTheLastTwoRecordsLosesOnlyTheTruncatedOne) {
     const Data whole = fourRecords();
     ASSERT_EQ(whole.size(), 225u);
     for (std::size_t size = 193; size <= 225; ++size) {
@@ -106,7 +106,7 @@ TEST(DLFReader, cutOffAtAnyByteOfTheLastTwoRecordsLosesOnlyWhatIsCut) {
         }
         const std::size_t left = size - begin;
         const std::size_t length = begin == 193 ? 15 : 17;
-        // A record is known as one once its header is whole: 12 bytes, and a type byte before them.
+        // A record is recognised when its header is complete: 12 bytes, and a type byte before them.
         const std::size_t header = begin == 193 ? 12 : 13;
         const std::string reason =
             left < header

@@ -21,7 +21,7 @@ using testing::IsEmpty;
 
 struct Case {
     const char* name;
-    const char* records;               ///< behind the version report
+    const char* records;               ///< after the version report
     std::vector<std::string> messages; ///< less number, place and time
 };
 
@@ -57,7 +57,7 @@ const Case cases[] = {
         0C00 0200 )" LATER R"(
         FF 0D00 0200 )" LATER R"( 3C)",
      {"FF0E000000" FIVE "3C3E", "FF10000100" FIVE "62706C69", "FF0C000200" LATER, "FF0D000200" LATER "3C"}},
-    {"OfTheBasebandWithAnExtraCode", // told by its type byte alone
+    {"OfTheBasebandWithAnExtraCode", // recognised only by its type byte
      R"(01 0D00 0100 )" FIVE R"( AA
         01 0F00 3271 )" FIVE R"( 010000)",
      {"010D000100" FIVE "AA", "010F003271" FIVE "010000"}},
@@ -106,7 +106,7 @@ TEST_P(DLFRecords, comeAsTheyArrived) {
     EXPECT_EQ(out.failure, "");
 }
 
-TEST_P(DLFRecords, comeInWhateverPiecesTheyAreRead) {
+TEST_P(DLFRecords, areTheSameForAnyReadSize) {
     const Data file = joined(versionReport(), hex(GetParam().records));
     const ReadOut whole = readAnyForm(file);
     for (const std::size_t piece : {1U, 2U, 3U, 7U, 13U})

@@ -17,7 +17,7 @@ namespace {
 TEST(DLFTechnology, looksAMebibyteAheadForTheTechnology) {
     const Data nobodys = bareRecord(0x0001, std::string(120'000, '0'), stampAfter(0)); // 60012 bytes
     const Data some = bareRecord(0x512C, "05000100", stampAfter(1));
-    const auto technologyBehind = [&](std::size_t records) {
+    const auto technologyAfter = [&](std::size_t records) {
         Data file = versionReport();
         std::vector<std::uint8_t> bytes(file.bytes().begin(), file.bytes().end());
         for (std::size_t i = 0; i < records; ++i)
@@ -25,11 +25,11 @@ TEST(DLFTechnology, looksAMebibyteAheadForTheTechnology) {
         return readAnyForm(joined(Data(std::move(bytes)), some)).technology;
     };
     // 17 of them are 1020221 bytes with their type bytes, 18 are above the 1048576.
-    EXPECT_EQ(technologyBehind(17), "Ostrel_GSM");
-    EXPECT_EQ(technologyBehind(18), "");
+    EXPECT_EQ(technologyAfter(17), "Ostrel_GSM");
+    EXPECT_EQ(technologyAfter(18), "");
 }
 
-/// So many records of these codes in turn.
+/// This many records, of these codes one after another.
 Data recordsOf(std::initializer_list<std::uint16_t> codes, int rounds) {
     std::vector<std::uint8_t> bytes;
     std::uint64_t units = 0;
@@ -41,7 +41,7 @@ Data recordsOf(std::initializer_list<std::uint16_t> codes, int rounds) {
     return Data(std::move(bytes));
 }
 
-TEST(DLFTechnology, tellsTheTechnologyFromTheLogCodes) {
+TEST(DLFTechnology, recognisesTheTechnologyByItsLogCodes) {
     struct Told {
         const char* name;
         Data records;

@@ -42,7 +42,7 @@ protected:
 
     FakeClock _clock;
     FakeResources _resources;
-    FakeMedium _medium;
+    FakeOutputFile _medium;
 };
 
 TEST_F(DLFWriterTest, beginsWithTheVersionReport) {
@@ -59,7 +59,7 @@ TEST_F(DLFWriterTest, beginsWithTheVersionReport) {
     EXPECT_EQ(written(0), hexText(wanted.bytes()));
 }
 
-TEST_F(DLFWriterTest, takesTheTypeByteOfRecordsThatTellItByTheirCode) {
+TEST_F(DLFWriterTest, dropsTypeBytesThatFollowFromTheCode) {
     struct Case {
         const char* name;
         const char* message;
@@ -75,7 +75,7 @@ TEST_F(DLFWriterTest, takesTheTypeByteOfRecordsThatTellItByTheirCode) {
         {"prefixed", "8171 01 0D00 2C51 0000000000000000 05", "8171010D002C51000000000000000005"},
     };
     for (const Case& each : cases) {
-        _medium = FakeMedium();
+        _medium = FakeOutputFile();
         const auto writer = make();
         EXPECT_TRUE(writer->append(hex(each.message).bytes())) << each.name;
         EXPECT_TRUE(writer->close()) << each.name;
@@ -85,7 +85,7 @@ TEST_F(DLFWriterTest, takesTheTypeByteOfRecordsThatTellItByTheirCode) {
     }
 }
 
-TEST_F(DLFWriterTest, refusesWhatCouldNotBeFollowed) {
+TEST_F(DLFWriterTest, refusesMessagesThatHideTheNextRecord) {
     struct Case {
         const char* message;
         const char* reason;
@@ -96,9 +96,9 @@ TEST_F(DLFWriterTest, refusesWhatCouldNotBeFollowed) {
         {"01 0B00 2C51 00000000000000", "message of 12 bytes, wanted a record header of 13 at least"},
         {"8171 01 0B00 2C51 00000000000000", "message of 14 bytes, wanted a record header of 13 at least"},
         {"01 1100 2C51 0000000000000000 05000100",
-         "record length 17 in a message whose record has 16 bytes behind its type"},
+         "record length 17 in a message whose record has 16 bytes after its type"},
         {"8171 01 0000 2C51 0000000000000000 05",
-         "record length 0 in a message whose record has 13 bytes behind its type"},
+         "record length 0 in a message whose record has 13 bytes after its type"},
     };
     const auto writer = make();
     for (const Case& each : cases) {
@@ -137,7 +137,7 @@ TEST_F(DLFWriterTest, whatItWritesIsReadAgain) {
     EXPECT_THAT(out.losses, IsEmpty());
 }
 
-TEST_F(DLFWriterTest, tellsAFailureFromThenOn) {
+TEST_F(DLFWriterTest, repeatsAFailure) {
     _medium.room = 170;
     const auto writer = make();
     EXPECT_TRUE(writer->append(record(0x512C, "05000100").bytes()));
@@ -154,7 +154,7 @@ TEST_F(DLFWriterTest, tellsAFailureFromThenOn) {
     EXPECT_EQ(none.reason(), "cannot write drive.dlf: No space left on device");
 }
 
-TEST_F(DLFWriterTest, takesNoMessageBehindAFailure) {
+TEST_F(DLFWriterTest, acceptsNoMessageAfterAFailure) {
     _medium.room = 161;
     const auto writer = make();
     // What is gathered goes out from 64 KiB on: two records of 40012 bytes.
@@ -169,7 +169,7 @@ TEST_F(DLFWriterTest, takesNoMessageBehindAFailure) {
     EXPECT_EQ(_medium.content.size(), 161u);
 }
 
-TEST_F(DLFWriterTest, tellsWhatTheMediumSaysInTheEnd) {
+TEST_F(DLFWriterTest, reportsAFailedFinalSync) {
     struct Case {
         const char* name;
         bool isRegular;
@@ -186,7 +186,7 @@ TEST_F(DLFWriterTest, tellsWhatTheMediumSaysInTheEnd) {
         {"a pipe that is not closed", false, EIO, EIO, "cannot close drive.dlf: Input/output error"},
     };
     for (const Case& each : cases) {
-        _medium = FakeMedium();
+        _medium = FakeOutputFile();
         _medium.isRegular = each.isRegular;
         _medium.syncError = each.syncError;
         _medium.closeError = each.closeError;

@@ -39,7 +39,7 @@ TEST_F(DescriptorFileTest, NewFileIsWrittenAndCut) {
     DescriptorFile file(open(O_WRONLY | O_CREAT), true);
     EXPECT_TRUE(file.isRegular());
     EXPECT_EQ(file.write(_three.bytes()).bytes, 3U);
-    EXPECT_EQ(file.cutTo(1), 0);
+    EXPECT_EQ(file.truncateTo(1), 0);
     EXPECT_EQ(file.write(_three.bytes()).bytes, 3U);
     EXPECT_EQ(content(), "aabc");
     EXPECT_EQ(file.close(), 0);
@@ -51,9 +51,9 @@ TEST_F(DescriptorFileTest, WhatStoodThereBeforeIsNeverCut) {
     DescriptorFile file(open(O_WRONLY | O_APPEND), true);
     EXPECT_TRUE(file.isRegular());
     EXPECT_EQ(file.write(_three.bytes()).bytes, 3U);
-    EXPECT_EQ(file.cutTo(2), 0);
+    EXPECT_EQ(file.truncateTo(2), 0);
     EXPECT_EQ(content(), "beforeab");
-    EXPECT_EQ(file.cutTo(0), 0);
+    EXPECT_EQ(file.truncateTo(0), 0);
     EXPECT_EQ(content(), "before");
 }
 
@@ -72,7 +72,7 @@ TEST_F(DescriptorFileTest, PipeCannotBeCut) {
     ::close(ends[0]);
 }
 
-TEST_F(DescriptorFileTest, DescriptorOfSomebodyElseStaysOpen) {
+TEST_F(DescriptorFileTest, ForeignDescriptorStaysOpen) {
     const int descriptor = open(O_WRONLY | O_CREAT);
     EXPECT_EQ(DescriptorFile(descriptor, false).close(), 0);
     EXPECT_EQ(::close(descriptor), 0);
@@ -100,21 +100,21 @@ TEST_F(DescriptorFileTest, SizeLimitIsAnError) {
 
 TEST_F(DescriptorFileTest, SyncIsWaitedForElsewhere) {
     DescriptorFile file(open(O_WRONLY | O_CREAT), true);
-    EXPECT_FALSE(file.takeSyncOutcome()) << "none was started";
+    EXPECT_FALSE(file.takeSyncResult()) << "none was started";
     EXPECT_EQ(file.write(_three.bytes()).bytes, 3U);
     file.startSync();
     file.startSync();
     std::optional<int> outcome;
-    while (!(outcome = file.takeSyncOutcome()))
+    while (!(outcome = file.takeSyncResult()))
         std::this_thread::yield();
     EXPECT_EQ(outcome, 0);
-    EXPECT_FALSE(file.takeSyncOutcome()) << "it is taken once";
+    EXPECT_FALSE(file.takeSyncResult()) << "it is taken once";
     EXPECT_EQ(file.sync(), 0);
     file.startSync();
     EXPECT_EQ(file.close(), 0) << "closing waits for it";
 }
 
-TEST_F(DescriptorFileTest, SyncOfWhatHasNoMediumSaysSo) {
+TEST_F(DescriptorFileTest, SyncOfAPipeIsAnError) {
     int ends[2];
     ASSERT_EQ(::pipe2(ends, O_CLOEXEC), 0);
     DescriptorFile file(ends[1], true);

@@ -3,7 +3,7 @@
 
 #pragma once
 
-#include "Recording/Files/RecordingFile.h"
+#include "Recording/Files/OutputFile.h"
 
 #include <algorithm>
 #include <cerrno>
@@ -16,7 +16,7 @@
 namespace velmora {
 
 /// A disk as a test wants it. It outlives the file that the writer has of it.
-struct FakeMedium {
+struct FakeOutputFile {
     std::vector<std::uint8_t> content;
     std::size_t room = SIZE_MAX; ///< how much the file may hold; a write that finds some room takes it
     int fullError = ENOSPC;      ///< what a write gives that finds none
@@ -26,15 +26,15 @@ struct FakeMedium {
 
     std::size_t syncsStarted = 0;
     std::optional<int> syncOutcome; ///< of the sync under way; the test sets it
-    int syncError = 0;              ///< of the sync that is waited for; told once, as systems do
+    int syncError = 0;              ///< of the awaited sync; returned once, as systems do
     std::size_t syncsWaitedFor = 0;
     bool closed = false;
     int closeError = 0;
 };
 
-class FakeRecordingFile final : public RecordingFile {
+class FakeRecordingFile final : public OutputFile {
 public:
-    explicit FakeRecordingFile(FakeMedium& medium) : _medium(medium) {}
+    explicit FakeRecordingFile(FakeOutputFile& medium) : _medium(medium) {}
 
     Written write(Bytes bytes) override {
         const std::size_t left = _medium.room - std::min(_medium.room, _medium.content.size());
@@ -46,14 +46,14 @@ public:
         return {count, 0};
     }
     [[nodiscard]] bool isRegular() const override { return _medium.isRegular; }
-    int cutTo(std::uint64_t size) override {
+    int truncateTo(std::uint64_t size) override {
         if (_medium.cutError != 0)
             return _medium.cutError;
         _medium.content.resize(static_cast<std::size_t>(size));
         return 0;
     }
     void startSync() override { ++_medium.syncsStarted; }
-    std::optional<int> takeSyncOutcome() override {
+    std::optional<int> takeSyncResult() override {
         const std::optional<int> outcome = _medium.syncOutcome;
         _medium.syncOutcome.reset();
         return outcome;
@@ -70,7 +70,7 @@ public:
     }
 
 private:
-    FakeMedium& _medium;
+    FakeOutputFile& _medium;
 };
 
 } // namespace velmora

@@ -15,7 +15,7 @@
 namespace velmora {
 namespace {
 
-Data rawMaterial() {
+Data rawMessages() {
     return joined(stampedRecord(0x512C, "05000100", stampAfter(0)), hex("8171"),
                   stampedRecord(0x7132, "010000", stampAfter(1)),
                   stampedRecord(0x0002, "3C61727261792F3E", stampAfter(2), 0xFF), hex("01 1000 2C51"),
@@ -24,16 +24,16 @@ Data rawMaterial() {
 }
 
 Data log() {
-    return joined(versionReport(), rawMaterial().from(1), rawMaterial().from(1));
+    return joined(versionReport(), rawMessages().from(1), rawMessages().from(1));
 }
 
 Data snapshot(bool binary) {
-    return snapshotFile({historyEntry(rawMaterial(), "2026-11-16 05:00:02 +0000"),
-                         historyEntry(rawMaterial(), "2026-11-16 05:00:04 +0000")},
+    return snapshotFile({historyEntry(rawMessages(), "2026-11-16 05:00:02 +0000"),
+                         historyEntry(rawMessages(), "2026-11-16 05:00:04 +0000")},
                         binary);
 }
 
-/// What is read holds together: numbers ascend, times are there, and what is not read is told.
+/// What is read is consistent: numbers ascend, times are present, and what is not read is reported.
 void expectSound(const Data& file, const std::string& what) {
     const ReadOut out = readAnyForm(file);
     if (!out.failure.empty()) {

@@ -71,7 +71,7 @@ TEST(InterfaceDescription, readsItsOptionsInBothByteOrders) {
         0900 0100 8A 000000          # resolution
         0E00 0800 FFFFFFFFFFFFFFFF   # offset
         0000 0000
-        FFFF FFFF                    # behind the end, not read)";
+        FFFF FFFF                    # after the end, not read)";
     const char* const bigEndian = R"(0093 0000 00000000
         0003 0003 616263 00
         0002 0004 4C544520

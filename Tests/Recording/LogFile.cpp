@@ -43,9 +43,9 @@ std::uint64_t stampAfter(std::uint64_t units) {
     return recordTimestamp(FakeClock::defaultNow()) + (units << 16);
 }
 
-DictionaryRef historyEntry(Value rawMaterial, std::string_view date) {
+DictionaryRef historyEntry(Value rawMessages, std::string_view date) {
     DictionaryRef entry = makeDictionary();
-    entry->set("DisplayState", std::move(rawMaterial));
+    entry->set("DisplayState", std::move(rawMessages));
     entry->set("Display", makeDictionary());
     entry->set("ExtraInfo", makeDictionary());
     entry->set("Date", date);

@@ -16,7 +16,7 @@
 
 namespace velmora {
 
-/// A record less its type byte, as it stands in a DLF log: length, code, time stamp, payload.
+/// A record less its type byte, as in a DLF log: length, code, time stamp, payload.
 [[nodiscard]] Data bareRecord(std::uint16_t code, std::string_view payloadHex, std::uint64_t timestamp = 0);
 /// As above with the type byte: the message as it arrives.
 [[nodiscard]] Data stampedRecord(std::uint16_t code, std::string_view payloadHex, std::uint64_t timestamp,
@@ -26,15 +26,15 @@ namespace velmora {
 /// A time stamp: 2026-11-16 05:00:00 UTC and so many units of 1.25 ms.
 [[nodiscard]] std::uint64_t stampAfter(std::uint64_t units);
 
-/// A history entry with that raw material and that date.
-[[nodiscard]] DictionaryRef historyEntry(Value rawMaterial, std::string_view date);
+/// A history entry with these raw messages and that date.
+[[nodiscard]] DictionaryRef historyEntry(Value rawMessages, std::string_view date);
 /// A snapshot of the entries.
 [[nodiscard]] Value snapshotOf(std::initializer_list<Value> entries);
 /// The same as a file, an XML or a binary property list.
 [[nodiscard]] Data snapshotFile(std::initializer_list<Value> entries, bool binary = false);
 
-/// What openMessages and the reader gave until the end. A message that a refresh follows has its time behind
-/// it: "1 at 0, 5 ns: 0A0B, refresh at 2 ns".
+/// What openMessages and the reader returned until the end. A message that a refresh follows is followed by
+/// the refresh's time: "1 at 0, 5 ns: 0A0B, refresh at 2 ns".
 [[nodiscard]] ReadOut readAnyForm(const Data& file, std::size_t piece = SIZE_MAX,
                                   std::size_t good = SIZE_MAX);
 

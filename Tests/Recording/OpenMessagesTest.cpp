@@ -4,8 +4,8 @@
 #include "Recording/OpenMessages.h"
 
 #include "Recording/Files/FileSource.h"
-#include "Recording/Pcapng/RecordingReader.h"
-#include "Recording/Pcapng/RecordingWriter.h"
+#include "Recording/Pcapng/PcapngReader.h"
+#include "Recording/Pcapng/PcapngWriter.h"
 #include "Tests/Recording/LogFile.h"
 #include "Tests/Recording/PcapngFile.h"
 #include "Tests/Support/TemporaryDirectory.h"
@@ -41,7 +41,7 @@ protected:
     TemporaryDirectory _directory;
 };
 
-TEST_F(OpenMessages, opensARecordingWhateverItsName) {
+TEST_F(OpenMessages, opensARecordingOfAnyName) {
     const std::string path =
         fileOf(PcapngFile().head().message(7, hex("0102").bytes()).data(), "snapshot.velmora");
     auto reader = openMessages(path);
@@ -80,10 +80,10 @@ TEST_F(OpenMessages, readsStandardInputThroughAPipe) {
     ::close(standardInput);
 }
 
-TEST_F(OpenMessages, givesMessagesOfAPipeAsSoonAsTheyAreWhole) {
+TEST_F(OpenMessages, returnsMessagesOfAPipeOnceComplete) {
     int ends[2];
     ASSERT_EQ(::pipe(ends), 0);
-    auto writer = RecordingWriter::adopt(ends[1], "pipe", "Ostrel_LTE");
+    auto writer = PcapngWriter::adopt(ends[1], "pipe", "Ostrel_LTE");
     ASSERT_TRUE(writer);
     auto reader = openMessages("/dev/fd/" + std::to_string(ends[0]));
     ASSERT_TRUE(reader) << reader.reason();
@@ -107,12 +107,12 @@ TEST_F(OpenMessages, waitsWherePipesDoNotBlock) {
     const std::vector<std::uint8_t> message(1'000, 0x5A);
     // Far more than a pipe holds: each side finds it full or empty at times.
     std::thread other([&] {
-        auto writer = RecordingWriter::adopt(ends[1], "pipe", "Ostrel_LTE");
+        auto writer = PcapngWriter::adopt(ends[1], "pipe", "Ostrel_LTE");
         for (int i = 0; i < count; ++i)
             EXPECT_TRUE((*writer)->append(Time(std::chrono::nanoseconds(i)), message));
         EXPECT_TRUE((*writer)->close());
     });
-    auto reader = RecordingReader::open(ChunkedInput(std::make_unique<FileSource>(ends[0], true)));
+    auto reader = PcapngReader::open(ChunkedInput(std::make_unique<FileSource>(ends[0], true)));
     EXPECT_TRUE(reader);
     int messages = 0;
     while (const auto next = (*reader)->next()) {
@@ -124,7 +124,7 @@ TEST_F(OpenMessages, waitsWherePipesDoNotBlock) {
     EXPECT_EQ((*reader)->lossTotals().losses, 0U);
 }
 
-TEST_F(OpenMessages, tellsTheFormByWhatTheFileBeginsWith) {
+TEST_F(OpenMessages, recognisesTheFormByItsFirstBytes) {
     const Data list = snapshotFile({historyEntry(record(0x512C, "05000100"), "2026-11-16 05:00:02 +0000")});
     const Data document = hex("EFBBBF 0A20"); // a mark of UTF-8, and white space
     const auto formOf = [this](const Data& content) {

@@ -85,12 +85,12 @@ std::string describe(const LoggedMessage& message) {
 
 std::string describe(const Loss& loss) {
     return "at " + std::to_string(loss.offset) + ", " + std::to_string(loss.bytes) + " bytes, record " +
-           std::to_string(loss.recordNumber) + (loss.isTail ? ", tail: " : ": ") + loss.reason;
+           std::to_string(loss.recordNumber) + (loss.isTruncation ? ", tail: " : ": ") + loss.reason;
 }
 
 ReadOut readOut(const Data& file, std::size_t piece, std::size_t good) {
     ReadOut out;
-    auto reader = RecordingReader::open(ChunkedInput(std::make_unique<MemorySource>(file, piece, good)));
+    auto reader = PcapngReader::open(ChunkedInput(std::make_unique<MemorySource>(file, piece, good)));
     if (!reader) {
         out.failure = reader.reason();
         return out;

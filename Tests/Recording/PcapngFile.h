@@ -3,7 +3,7 @@
 
 #pragma once
 
-#include "Recording/Pcapng/RecordingReader.h"
+#include "Recording/Pcapng/PcapngReader.h"
 #include "Tests/Support/Hex.h"
 
 #include <cstdint>
@@ -16,7 +16,7 @@
 
 namespace velmora {
 
-/// Blocks one behind the other, in one byte order. Every call appends.
+/// Blocks one after another, in one byte order. Every call appends.
 class PcapngFile {
 public:
     explicit PcapngFile(bool bigEndian = false) : _bigEndian(bigEndian) {}
@@ -25,7 +25,7 @@ public:
     PcapngFile& block(std::uint32_t type, Bytes body);
     /// A section header without options.
     PcapngFile& section();
-    /// An interface description; `options` is appended as it stands.
+    /// An interface description; `options` is appended unchanged.
     PcapngFile& interface(std::uint16_t linkType, Bytes options = {}, std::uint32_t snapLength = 0);
     /// One of link type 147 with nanoseconds and, unless it is empty, a name.
     PcapngFile& messageInterface(std::string_view name);
@@ -48,7 +48,7 @@ private:
     std::vector<std::uint8_t> _bytes;
 };
 
-/// Gives memory out in pieces of at most `piece` bytes; after `good` bytes reading fails.
+/// Returns memory in reads of at most `piece` bytes; after `good` bytes reading fails.
 class MemorySource final : public ByteSource {
 public:
     explicit MemorySource(Data data, std::size_t piece = SIZE_MAX, std::size_t good = SIZE_MAX)
@@ -68,7 +68,7 @@ struct ReadOut {
     std::vector<std::string> messages; ///< "1 at 76, 5 ns: 0A0B"
     std::vector<std::string> losses; ///< "at 76, 36 bytes, record 1: reason", with ", tail" before the colon
     std::string failure;             ///< of opening or of reading
-    RecordingReader::PassedOver passedOver;
+    PcapngReader::PassedOver passedOver;
 };
 
 [[nodiscard]] std::string hexText(Bytes bytes);

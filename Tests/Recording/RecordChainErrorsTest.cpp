@@ -62,7 +62,7 @@ TEST_P(RecordChainErrors, areRareWithAnyWeightTwoBitsOff) {
         &RecordWeights::type,           &RecordWeights::prefix,        &RecordWeights::wantedCode,
         &RecordWeights::versionReport,  &RecordWeights::nearTimestamp, &RecordWeights::zeroAmongZeros,
         &RecordWeights::zeroAmongTimes, &RecordWeights::farTimestamp,  &RecordWeights::badTimestamp,
-        &RecordWeights::endOfInput,     &RecordWeights::goodEnd,       &RecordWeights::expected,
+        &RecordWeights::endOfInput,     &RecordWeights::goodFollower,  &RecordWeights::expected,
         &RecordWeights::sure,
     };
     constexpr std::size_t count = 10;

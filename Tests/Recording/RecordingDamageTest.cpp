@@ -33,7 +33,7 @@ const std::vector<std::string> fourTexts{"1 at 76, 1 ns: A0A1A2A3A4", "2 at 116,
                                          "3 at 156, 1 ns: C0C1C2C3C4", "4 at 196, 1 ns: D0D1D2D3D4"};
 constexpr std::size_t fourSize = 236;
 
-/// The four without the one at `lost`; the numbers of those after it stand where it was not counted.
+/// The four without the one at `lost`; those after it keep their numbers unless it was not counted.
 std::vector<std::string> without(std::size_t lost) {
     std::vector<std::string> texts;
     for (std::size_t i = 0; i < fourTexts.size(); ++i) {
@@ -43,7 +43,7 @@ std::vector<std::string> without(std::size_t lost) {
     return texts;
 }
 
-TEST(RecordingDamage, cutOffAtAnyByteOfTheLastTwoBlocksLosesOnlyWhatIsCut) {
+TEST(RecordingDamage, truncationInTheLastTwoBlocksLosesOnlyTheTruncatedOne) {
     const Data whole = fourMessages().data();
     ASSERT_EQ(whole.size(), fourSize);
     for (std::size_t size = 156; size < fourSize; ++size) {
@@ -205,7 +205,7 @@ TEST(RecordingDamage, ofAnyOneByteGivesMessagesOrLosses) {
             // The head's damage may change how all is read; a block's changes that block alone.
             if (at >= 76) {
                 EXPECT_GE(kept, 3) << where;
-                // A changed type makes a block of another kind, which is no loss that anybody could know of.
+                // A changed type makes a block of another kind, which is a loss that cannot be detected.
                 const bool inType = (at - 76) % 40 < 4;
                 EXPECT_TRUE(inType || out.messages.size() + out.losses.size() >= 4) << where;
             } else {
@@ -223,7 +223,7 @@ TEST(RecordingDamage, ofAnyKindKeepsMessagesAndLossesInOrderAndApart) {
         file.head();
         for (std::size_t i = 0; i < 30; ++i)
             file.message(i, std::vector<std::uint8_t>(random() % 50, static_cast<std::uint8_t>(i)));
-        // A few bytes changed, taken out or put in, behind the first section's magic.
+        // A few bytes changed, removed or inserted, after the first section's magic.
         for (auto changes = random() % 6; changes > 0; --changes) {
             const auto place = file.bytes().begin() + 12 + static_cast<long>(random() % (file.size() - 12));
             const auto length = std::min<long>(static_cast<long>(random() % 9), file.bytes().end() - place);
@@ -236,7 +236,7 @@ TEST(RecordingDamage, ofAnyKindKeepsMessagesAndLossesInOrderAndApart) {
                 std::fill_n(place, length, static_cast<std::uint8_t>(random()));
         }
         const Data data = file.data();
-        auto reader = RecordingReader::open(ChunkedInput(std::make_unique<MemorySource>(data, 100), 8192));
+        auto reader = PcapngReader::open(ChunkedInput(std::make_unique<MemorySource>(data, 100), 8192));
         ASSERT_TRUE(reader) << reader.reason();
         std::uint64_t number = 0;
         std::uint64_t end = 0;
@@ -248,7 +248,7 @@ TEST(RecordingDamage, ofAnyKindKeepsMessagesAndLossesInOrderAndApart) {
             end = message->offset + 16 + message->message.size();
             ASSERT_LE(end, data.size()) << round;
             stretches.emplace_back(message->offset, end);
-            // Its bytes stand in the file, behind a header of 12 (simple) or 28 bytes.
+            // Its bytes are in the file, after a header of 12 (simple) or 28 bytes.
             const auto standsBehind = [&](std::size_t header) {
                 const std::size_t begin = message->offset + header;
                 return begin + message->message.size() <= data.size() &&

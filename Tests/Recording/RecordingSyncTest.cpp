@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Tests/Recording/RecordingTroubleFixture.h"
+#include "Tests/Recording/PcapngWriterFixture.h"
 
 #include <cerrno>
 #include <vector>
@@ -13,7 +13,7 @@ namespace {
 
 using testing::ElementsAre;
 
-using RecordingSyncTest = RecordingTroubleFixture;
+using RecordingSyncTest = PcapngWriterFixture;
 
 TEST_F(RecordingSyncTest, SyncIsStartedForWhatIsNewAndOneAtATime) {
     start();
@@ -34,7 +34,7 @@ TEST_F(RecordingSyncTest, SyncIsStartedForWhatIsNewAndOneAtATime) {
     EXPECT_EQ(medium.syncsWaitedFor, 1U);
 }
 
-TEST_F(RecordingSyncTest, WhatTheMediumLostIsWrittenOnceMore) {
+TEST_F(RecordingSyncTest, DataOfAFailedSyncIsRewritten) {
     start();
     ASSERT_TRUE(append(1));
     ASSERT_TRUE(writer->sync());
@@ -44,19 +44,19 @@ TEST_F(RecordingSyncTest, WhatTheMediumLostIsWrittenOnceMore) {
     ASSERT_TRUE(append(3));
     ASSERT_TRUE(writer->flush());
     EXPECT_THAT(numbers(), ElementsAre(1, 2, 3));
-    // The second message never reached the medium, and nobody knows of the third.
+    // The second message was never synced, and the third is unknown.
     medium.syncOutcome = EIO;
     EXPECT_EQ(reasonOf(writer->sync()), broken);
-    EXPECT_TRUE(writer->isWaiting());
+    EXPECT_TRUE(writer->hasTemporaryError());
     EXPECT_THAT(numbers(), ElementsAre(1));
     EXPECT_EQ(writer->unsaved().messages, 2U);
     ASSERT_TRUE(writer->sync());
-    EXPECT_FALSE(writer->isWaiting());
+    EXPECT_FALSE(writer->hasTemporaryError());
     EXPECT_EQ(medium.syncsStarted, 3U);
     EXPECT_THAT(numbers(), ElementsAre(1, 2, 3));
 }
 
-TEST_F(RecordingSyncTest, MediumGetsASecondTryInTheEnd) {
+TEST_F(RecordingSyncTest, FinalSyncIsRetried) {
     start();
     ASSERT_TRUE(writer->sync());
     medium.syncOutcome = 0;
@@ -68,7 +68,7 @@ TEST_F(RecordingSyncTest, MediumGetsASecondTryInTheEnd) {
     EXPECT_THAT(numbers(), ElementsAre(1));
 }
 
-TEST_F(RecordingSyncTest, MediumThatFailsInTheEndIsToldWhereNothingWasKept) {
+TEST_F(RecordingSyncTest, FailedFinalSyncIsReportedWhereNothingCanBeRewritten) {
     start();
     ASSERT_TRUE(append(1));
     medium.syncError = ENOSPC;
@@ -76,14 +76,14 @@ TEST_F(RecordingSyncTest, MediumThatFailsInTheEndIsToldWhereNothingWasKept) {
     EXPECT_EQ(medium.syncsWaitedFor, 1U);
 }
 
-TEST_F(RecordingSyncTest, FileThatIsNotClosedIsToldUnlessThereWasTroubleBefore) {
+TEST_F(RecordingSyncTest, FailedCloseIsReportedUnlessAnErrorCameFirst) {
     start();
     ASSERT_TRUE(append(1));
     medium.closeError = EIO;
     EXPECT_EQ(reasonOf(writer->close()), "cannot close the recording: Input/output error");
     EXPECT_THAT(numbers(), ElementsAre(1));
 
-    medium = FakeMedium();
+    medium = FakeOutputFile();
     start();
     ASSERT_TRUE(append(1));
     medium.room = headSize;
@@ -91,7 +91,7 @@ TEST_F(RecordingSyncTest, FileThatIsNotClosedIsToldUnlessThereWasTroubleBefore) 
     EXPECT_EQ(reasonOf(writer->close()), full);
 }
 
-TEST_F(RecordingSyncTest, FileSystemWithoutAMediumIsNoTrouble) {
+TEST_F(RecordingSyncTest, FileSystemWithoutSyncIsNoError) {
     start();
     ASSERT_TRUE(append(1));
     medium.syncError = EINVAL;
@@ -99,10 +99,10 @@ TEST_F(RecordingSyncTest, FileSystemWithoutAMediumIsNoTrouble) {
     EXPECT_THAT(numbers(), ElementsAre(1));
 }
 
-TEST_F(RecordingSyncTest, KeepsNoMoreThanItsShareForASlowMedium) {
+TEST_F(RecordingSyncTest, BoundsUnsyncedDataOnSlowStorage) {
     start();
     ASSERT_TRUE(writer->sync());
-    // The medium says nothing while 9 MiB are written, one more than are kept.
+    // The sync does not finish while 9 MiB are written, one more than are kept.
     const std::vector<std::uint8_t> large(1 << 20, 7);
     for (int i = 0; i < 9; ++i)
         ASSERT_TRUE(writer->append(Time(), large));

@@ -39,7 +39,7 @@ TEST(SnapshotReader, givesTheMessagesOfEachRefresh) {
             {historyEntry(joined(idle(), registered(), registered()), "2026-11-16 05:00:02 +0000"),
              historyEntry(registered(), "2026-11-16 05:00:04 +0000")},
             binary));
-        // Offsets are those in the entry's raw material, 49 bytes; the times spread over the 2 s before.
+        // Offsets are those in the entry's raw messages, 49 bytes; the times spread over the 2 s before.
         EXPECT_THAT(
             out.messages,
             ElementsAre("1 at 0, " + at(0) + ": " + idleHex,
@@ -52,7 +52,7 @@ TEST(SnapshotReader, givesTheMessagesOfEachRefresh) {
     }
 }
 
-TEST(SnapshotReader, splitsRawMaterialAsItCame) {
+TEST(SnapshotReader, splitsRawMessagesUnchanged) {
     // With prefixes, a wrong type, and records of the extra stream.
     const Data raw = hex(R"(02 0F00 3271 0000000000000000 010000
                             01 1000 2C51 0000000000000000 05000100
@@ -200,7 +200,7 @@ Value dlfItem(const Data& log) {
     return item;
 }
 
-TEST(SnapshotReader, turnsToTheLogWhereNoEntryHasRawMaterial) {
+TEST(SnapshotReader, fallsBackToTheLogWithoutRawMessages) {
     const Data log = joined(versionReport(), bareRecord(0x512C, "05000100", stampAfter(0)),
                             stampedRecord(0x7132, "010000", stampAfter(800)), hex("DEAD"));
     const ReadOut out = readAnyForm(snapshotFile({makeDictionary(), dlfItem(log)}));
@@ -211,7 +211,7 @@ TEST(SnapshotReader, turnsToTheLogWhereNoEntryHasRawMaterial) {
                             "record of 12 at least"));
     EXPECT_EQ(out.technology, "Ostrel_GSM");
 
-    // The same messages stand in the entries and in the log: they come once.
+    // The entries and the log have the same messages, which are read once.
     const ReadOut both =
         readAnyForm(snapshotFile({historyEntry(idle(), "2026-11-16 05:00:02 +0000"), dlfItem(log)}));
     EXPECT_THAT(both.messages, ElementsAre("1 at 0, " + at(0) + ": " + idleHex + ", refresh at " + at(2)));

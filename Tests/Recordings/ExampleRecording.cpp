@@ -3,7 +3,7 @@
 
 #include "Tests/Recordings/ExampleRecording.h"
 
-#include "Recording/Pcapng/RecordingWriter.h"
+#include "Recording/Pcapng/PcapngWriter.h"
 #include "Telephony/Drives/DriveScenario.h"
 
 #include <chrono>
@@ -98,12 +98,12 @@ void ExampleRecording::eachMessage(const std::function<void(Time, const Data&)>&
         using Seconds = std::chrono::duration<double>;
         for (; Seconds(event.offset) < Seconds(excerpt.to_s); event = drive->next())
             if (Seconds(event.offset) >= Seconds(excerpt.from_s))
-                take(DriveScenario::beginning() + event.offset + arrivalDelay, event.message);
+                take(DriveScenario::startTime() + event.offset + arrivalDelay, event.message);
     }
 }
 
 Result<Done> ExampleRecording::write(const std::string& path) const {
-    const auto writer = RecordingWriter::create(path, makeScenario()->technology());
+    const auto writer = PcapngWriter::create(path, makeScenario()->technology());
     if (!writer)
         return Failure{writer.reason()};
     Result<Done> written = Done{};

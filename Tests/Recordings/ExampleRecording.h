@@ -15,9 +15,9 @@
 
 namespace velmora {
 
-/// A recording of this folder: excerpts of a scenario's drive, which is too long to be kept whole. Messages
-/// are stamped as if each had arrived a fixed time after the moment that its record tells, so that all comes
-/// of the table in the source, bit by bit. Main thread only.
+/// A recording of this folder: excerpts of a scenario's drive, which is too long to be kept completely. Each
+/// message's arrival time is its record's time stamp plus a fixed delay, so that the file depends on the
+/// table in the source alone and is the same at every run. Main thread only.
 struct ExampleRecording {
     /// Seconds of the drive, the end left out; in order, and apart from one another.
     struct Excerpt {

@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Recording/Pcapng/RecordingWriter.h"
+#include "Recording/Pcapng/PcapngWriter.h"
 #include "Telephony/Drives/DriveScenario.h"
 #include "Telephony/Drives/ScenarioRegistry.h"
 
@@ -21,7 +21,7 @@
 namespace velmora {
 namespace {
 
-/// The whole of `text` as a number.
+/// All of `text` as a number.
 std::optional<std::uint64_t> numberOf(std::string_view text) {
     std::uint64_t number = 0;
     const auto result = std::from_chars(text.data(), text.data() + text.size(), number);
@@ -49,14 +49,14 @@ std::optional<Length> lengthOf(std::string_view text) {
 }
 
 Result<Done> make(Scenario& scenario, const Length& length, const std::string& path) {
-    Result<std::unique_ptr<RecordingWriter>> writer = RecordingWriter::create(path, scenario.technology());
+    Result<std::unique_ptr<PcapngWriter>> writer = PcapngWriter::create(path, scenario.technology());
     if (!writer)
         return Failure{writer.reason()};
     for (std::uint64_t i = 0; i < length.messages; ++i) {
         const ScenarioEvent event = scenario.next();
         if (event.offset >= length.time)
             break;
-        const Time time = DriveScenario::beginning() + event.offset;
+        const Time time = DriveScenario::startTime() + event.offset;
         if (Result<Done> written = (*writer)->append(time, event.message.bytes()); !written)
             return written;
     }

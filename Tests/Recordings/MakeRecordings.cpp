@@ -6,7 +6,7 @@
 #include <cstdio>
 #include <filesystem>
 
-/// Makes the recordings of this folder anew: make-recordings DIRECTORY.
+/// Regenerates the recordings of this folder: make-recordings DIRECTORY.
 int main(int count, char** arguments) {
     if (count != 2) {
         std::fprintf(stderr, "usage: make-recordings DIRECTORY\n");

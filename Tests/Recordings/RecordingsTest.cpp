@@ -166,7 +166,7 @@ TEST_P(Recordings, decodeAsTheReferenceSays) {
     expectReference("decode --format text", std::string(GetParam().scenario), ".decode.txt");
 }
 
-TEST_P(Recordings, areToldOfAsTheReferenceSays) {
+TEST_P(Recordings, haveTheInfoOfTheReference) {
     expectReference("info", std::string(GetParam().scenario), ".info.txt");
 }
 

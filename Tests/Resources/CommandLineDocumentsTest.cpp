@@ -39,7 +39,7 @@ std::string manualOf(const std::string& program) {
     return {page.bytes().begin(), page.bytes().end()};
 }
 
-/// What stands in a manual from a line on that begins so up to the next heading of that kind.
+/// The part of a manual from the line with this beginning to the next heading of that kind.
 std::string section(const std::string& manual, const std::string& heading) {
     const std::size_t begin = manual.find("\n" + heading);
     if (begin == std::string::npos)
@@ -49,7 +49,7 @@ std::string section(const std::string& manual, const std::string& heading) {
     return manual.substr(from, end - from) + "\n";
 }
 
-/// The options that a part of a manual explains, with those that stand beside another in one item.
+/// The options that a part of a manual explains, including several in one item.
 Words explainedOptions(const std::string& text) {
     Words options;
     for (const std::string& item : allMatches(text, "^(\\.It .*Fl Fl .*)$"))

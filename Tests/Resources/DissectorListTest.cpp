@@ -21,7 +21,7 @@
 namespace velmora {
 namespace {
 
-/// The keys of a list, and its other texts and integers, in the order in which they stand in it.
+/// The keys of a list, and its other texts and integers, in their order.
 struct ListTexts {
     std::string keys;
     std::string values;
@@ -113,7 +113,7 @@ struct ListRow {
     const char* expert;
 };
 
-TEST(DissectorList, showsEachKindOfValueAndTellsWhatIsWrong) {
+TEST(DissectorList, showsEachKindOfValueAndMarksErrors) {
     NEEDS_PROGRAM("tshark");
     const ListRow rows[] = {
         {"false", listOf("08"), "false", ""},

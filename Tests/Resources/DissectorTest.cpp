@@ -61,7 +61,7 @@ std::string momentText(Time moment) {
 }
 
 /// Technology, prefix, type, length, code, sections, record, time and payload as we read them, separated by
-/// tabs. A code that no decoder looks at is left out.
+/// tabs. A code without subscriber is skipped.
 std::string ourReading(const std::string& technology, Bytes message) {
     const std::string name = technology + "\t";
     const auto header = LogMessage::parse(message);
@@ -121,7 +121,7 @@ TEST_F(Dissector, agreesOnEveryMessageOfTheRecordings) {
     }
 }
 
-/// The code and the sections of each message, as velmora-log tells of it.
+/// The code and the sections of each message, as velmora-log lists it.
 TEST_F(Dissector, agreesWithTheCommandLine) {
     for (const ExampleRecording& recording : exampleRecordings()) {
         const std::string path = VELMORA_SOURCE_DIR "/Tests/Recordings/" + recording.fileName();
@@ -209,7 +209,7 @@ const OddRow oddRows[] = {
      "0x512C  GSM RR Info  0 bytes"},
 };
 
-TEST_F(Dissector, tellsWhatIsOdd) {
+TEST_F(Dissector, marksMalformedMessages) {
     std::vector<Data> messages;
     for (const OddRow& row : oddRows)
         messages.push_back(hex(row.message));
@@ -222,7 +222,7 @@ TEST_F(Dissector, tellsWhatIsOdd) {
             << oddRows[i].what;
 }
 
-TEST_F(Dissector, tellsOfMessagesThatWereCutWhenTheyWereCaptured) {
+TEST_F(Dissector, marksMessagesTruncatedAtCapture) {
     NEEDS_PROGRAM("editcap");
     const std::string path = capture({hex("01 0C00 2C51 0000000000000000 01020304")});
     const std::string cut = _directory / "cut.pcapng";
@@ -270,7 +270,7 @@ TEST_F(Dissector, isLoadedFromTheDirectoryOfLuaPlugins) {
 
 /// Every prefix of a good message, and every one of its bytes turned over: `dissected` expects the dissector
 /// to bear it.
-TEST_F(Dissector, bearsWhateverItIsGiven) {
+TEST_F(Dissector, acceptsAnyInput) {
     const Data good = hex("8100 FF 2E00 0000 0000000000000000 62706C6973743030 D1 01 02 51 61 51 62 08 0B 0D"
                           "000000000000 01 01 0000000000000003 0000000000000000 000000000000000F");
     std::vector<Data> messages;

@@ -14,7 +14,7 @@ namespace velmora {
 
 namespace {
 
-/// What stands between a heading and the next empty line.
+/// The lines between a heading and the next empty line.
 std::string part(const std::string& text, const std::string& heading) {
     const std::size_t begin = text.find("\n" + heading + ":\n");
     if (begin == std::string::npos)

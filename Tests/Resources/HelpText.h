@@ -10,7 +10,7 @@
 
 namespace velmora {
 
-/// What a program's `--help` tells of its command line.
+/// A program's command line, parsed from its `--help`.
 struct HelpText {
     std::set<std::string> options; ///< the long ones: "--format"
     std::set<std::string> commands;

@@ -97,7 +97,7 @@ class IncludeCheckTest(unittest.TestCase):
         self.expect_none("Toolkit/Button.cpp", '"Toolkit/Widgets/Conversions.h"')
         self.expect_problem("Toolkit/Button.h", '"Toolkit/Widgets/Conversions.h"',
                             "Toolkit may not include Toolkit/Widgets")
-        self.expect_none("Toolkit/Widgets/Motion.h", "<QObject>")
+        self.expect_none("Toolkit/Widgets/Animation.h", "<QObject>")
 
     def test_the_operating_systems_headers_are_kept_out_of_the_interfaces(self) -> None:
         self.expect_none("Platform/Linux/Files/Files.cpp", "<sys/stat.h>")

@@ -9,7 +9,7 @@
 
 namespace velmora {
 
-/// A clock that stands still until it is told otherwise: at 2026-11-16 05:00:00 UTC, in a zone that is UTC.
+/// A clock that stands still until it is set: at 2026-11-16 05:00:00 UTC, in a zone that is UTC.
 class FakeClock final : public Clock {
 public:
     [[nodiscard]] static Time defaultNow() {

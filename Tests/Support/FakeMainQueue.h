@@ -14,9 +14,8 @@
 
 namespace velmora {
 
-/// A main queue in virtual time. Nothing runs before the test says so; time passes in `advance` alone, and
-/// the clock goes with it. Setting the clock by hand moves no task's hour. A timer may be stopped after the
-/// queue is gone.
+/// A main queue in virtual time. Nothing runs on its own; time passes only in `advance`, and the clock goes
+/// with it. Setting the clock manually does not move tasks. A timer may be stopped after the queue is gone.
 class FakeMainQueue final : public MainQueue {
 public:
     explicit FakeMainQueue(FakeClock& clock) : _clock(clock) {}
@@ -27,8 +26,8 @@ public:
     void after(std::chrono::nanoseconds delay, Task task) override;
     [[nodiscard]] std::unique_ptr<Timer> repeating(std::chrono::nanoseconds interval, Task action) override;
 
-    /// Runs the tasks that `async` queued, in order, with those that they queue in turn. Delayed tasks wait
-    /// for `advance`. Throws std::runtime_error when the tasks never come to an end.
+    /// Runs the tasks that `async` queued, in order, including those that they queue. Delayed tasks wait for
+    /// `advance`. Throws std::runtime_error when the tasks never come to an end.
     void runPending();
 
     /// Lets time pass: runs what is pending, then delayed tasks and timer ticks in the order of their time

@@ -44,7 +44,7 @@ public:
             callback(*self);
     }
 
-    /// False, and no name to give up again, where somebody else owns it.
+    /// False, and no name to release, where another port owns it.
     bool takeName() { return _registry->owners.emplace(_name, this).second; }
 
     bool deliver(std::int32_t messageId, const Data& payload, std::optional<Data>* reply) {

@@ -30,8 +30,7 @@ public:
         bool wantsReply = false;
     };
 
-    /// The peer behind a served name. What it answers is what the sender gets, but for a reply nobody asked
-    /// for.
+    /// The peer of a served name. The sender gets its answer, except for a reply that was not requested.
     using Handler =
         std::function<RemotePort::Answer(std::int32_t messageId, const Data& payload, bool wantsReply)>;
 
@@ -43,7 +42,7 @@ public:
     [[nodiscard]] Created createLocal(const std::string& name, MessageCallback callback) override;
     [[nodiscard]] std::shared_ptr<RemotePort> createRemote(const std::string& name) override;
 
-    /// The next `createLocal` gives no port.
+    /// The next `createLocal` returns no port.
     void failNextLocal();
     /// Whether a local port owns the name.
     [[nodiscard]] bool isTaken(const std::string& name) const;

@@ -74,7 +74,7 @@ TEST_F(FakeLocalPortTest, ATakenNameGivesAHandleThatLeavesTheOwnerAlone) {
     EXPECT_EQ(delivered, 1);
 }
 
-TEST_F(FakeLocalPortTest, TheNameIsFreeOnceItsOwnerIsInvalidOrGone) {
+TEST_F(FakeLocalPortTest, TheNameIsFreeOnceItsOwnerIsInvalidOrDestroyed) {
     auto first = _ports.createLocal(name, noAnswer()).port;
     first->invalidate();
     EXPECT_FALSE(_ports.isTaken(name));
@@ -87,7 +87,7 @@ TEST_F(FakeLocalPortTest, TheNameIsFreeOnceItsOwnerIsInvalidOrGone) {
     EXPECT_FALSE(_ports.createLocal(name, noAnswer()).alreadyExisted);
 }
 
-TEST_F(FakeLocalPortTest, FailsWhenToldTo) {
+TEST_F(FakeLocalPortTest, FailsOnRequest) {
     _ports.failNextLocal();
     const auto failed = _ports.createLocal(name, noAnswer());
     EXPECT_FALSE(failed.port);
@@ -95,7 +95,7 @@ TEST_F(FakeLocalPortTest, FailsWhenToldTo) {
     EXPECT_TRUE(_ports.createLocal(name, noAnswer()).port);
 }
 
-TEST_F(FakeLocalPortTest, InvalidationIsToldOnceWithTheNameAlreadyFree) {
+TEST_F(FakeLocalPortTest, InvalidationIsReportedOnceWithTheNameAlreadyFree) {
     const auto port = _ports.createLocal(name, noAnswer()).port;
     int calls = 0;
     port->setInvalidationCallback([&](LocalPort& invalid) {

@@ -40,7 +40,7 @@ TEST(CapturedLog, KeepsLinesAndPutsTheEarlierLogBack) {
     EXPECT_THAT(outer.lines(), IsEmpty());
 }
 
-TEST(FakeClock, StandsAtItsDefaultUntilItIsSet) {
+TEST(FakeClock, HasItsDefaultUntilSet) {
     FakeClock clock;
     EXPECT_EQ(dateDescription(clock.now()), "2026-11-16 05:00:00 +0000");
     clock.setNow(Time(std::chrono::seconds(1)));

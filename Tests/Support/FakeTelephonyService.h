@@ -21,7 +21,7 @@ public:
     bool available = true;
     /// What the log channel's creation ends with.
     VoxError error;
-    /// The remote port's name that it then gives.
+    /// The remote port's name that it then returns.
     std::string remotePortName = "com.velmora.test.channel";
 
     [[nodiscard]] std::shared_ptr<VoxServerConnection>
@@ -49,7 +49,7 @@ public:
             callback();
     }
 
-    /// Connections that somebody holds.
+    /// Connections that are held.
     [[nodiscard]] int liveConnections() const { return *_liveConnections; }
     /// How often a connection was asked for, in vain or not.
     [[nodiscard]] int connectionsAsked() const { return _connectionsAsked; }

@@ -39,7 +39,7 @@ namespace velmora {
 /// list. Throws std::invalid_argument for a value that has no such form.
 [[nodiscard]] Data extraRecord(std::uint16_t code, const Value& plist);
 
-/// The parts one behind the other.
+/// The parts concatenated.
 [[nodiscard]] Data joined(std::initializer_list<Data> parts);
 
 template <class... Part>

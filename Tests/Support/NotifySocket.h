@@ -19,7 +19,7 @@
 
 namespace velmora {
 
-/// The socket on which a service manager hears from its services.
+/// The socket on which a service manager receives its services' notifications.
 class NotifySocket {
 public:
     /// `address` is a path, or "@" and the name of an abstract socket. Throws std::system_error.

@@ -7,7 +7,7 @@
 
 namespace velmora {
 
-/// What came of a shell command.
+/// The result of a shell command.
 struct ShellOutcome {
     int status = -1;    ///< of its end: 0 to 255; -1 where it did not end by itself
     std::string output; ///< its standard output

@@ -18,7 +18,7 @@ using ::testing::IsEmpty;
 
 using LogServerClientsTest = LogServerTest;
 
-TEST_F(LogServerClientsTest, closesAChannelWhoseClientHasGone) {
+TEST_F(LogServerClientsTest, closesTheChannelOfAClosedClient) {
     listen();
     const std::string channel = createChannel("app");
     stream(channel);
@@ -42,16 +42,16 @@ TEST_F(LogServerClientsTest, closesAChannelWhosePortWasClosed) {
     EXPECT_EQ(source.stops, 1);
 }
 
-TEST_F(LogServerClientsTest, aClientThatGoesTakesNobodyAlong) {
+TEST_F(LogServerClientsTest, aClosedClientDoesNotAffectOthers) {
     listen();
     stream(createChannel("one"));
     stream(createChannel("two"));
     EXPECT_EQ(source.starts, 1);
-    source.sink->take(record(1, "00"));
+    source.sink->receive(record(1, "00"));
     ports.sever("one");
     queue.runPending();
     EXPECT_EQ(source.stops, 0);
-    source.sink->take(record(2, "00"));
+    source.sink->receive(record(2, "00"));
     EXPECT_THAT(sentTo("one"), ElementsAre(record(1, "00")));
     EXPECT_THAT(sentTo("two"), ElementsAre(record(1, "00"), record(2, "00")));
 }
@@ -65,7 +65,7 @@ TEST_F(LogServerClientsTest, aClientMayGoWhileAMessageIsSent) {
     const Value reply = request(serverName, plist({{"CreateLogChannel", "one"}}));
     stream(*(*reply.asDictionary())["Port"].asString());
     stream(createChannel("two"));
-    source.sink->take(record(1, "00"));
+    source.sink->receive(record(1, "00"));
     queue.runPending();
     EXPECT_EQ(server.channelCount(), 1U);
     EXPECT_THAT(sentTo("two"), ElementsAre(record(1, "00")));
@@ -89,7 +89,7 @@ TEST_F(LogServerClientsTest, aLateClientFirstGetsTheLatestOfEachState) {
     const Data sim = record(0x0000, "02", 0xFF);
     const Data contexts = record(0x0002, "03", 0xFF);
     for (const Data& each : {simBefore, record(0x5137, "00"), contexts, sim})
-        source.sink->take(each);
+        source.sink->receive(each);
 
     const std::string late = createChannel("two");
     const Value extra(std::make_shared<Array>(Array{0, 1, 2}));
@@ -107,7 +107,7 @@ TEST_F(LogServerClientsTest, aLateClientFirstGetsTheLatestOfEachState) {
 TEST_F(LogServerClientsTest, statesOfAnEarlierRunAreForgotten) {
     listen();
     stream(createChannel("one"));
-    source.sink->take(record(0x0000, "01", 0xFF));
+    source.sink->receive(record(0x0000, "01", 0xFF));
     ports.sever("one");
     queue.runPending();
     stream(createChannel("two"));
@@ -115,7 +115,7 @@ TEST_F(LogServerClientsTest, statesOfAnEarlierRunAreForgotten) {
     EXPECT_EQ(source.starts, 2);
 }
 
-TEST_F(LogServerClientsTest, aNewRunBeginsEvenIfTheLastClientHasJustGone) {
+TEST_F(LogServerClientsTest, aNewRunStartsRightAfterTheLastClientHasClosed) {
     listen();
     stream(createChannel("one"));
     ports.sever("one"); // what follows comes before the queue has had its turn
@@ -134,7 +134,7 @@ TEST_F(LogServerClientsTest, aNewChannelForTheSamePortReplacesTheOld) {
     EXPECT_FALSE(ports.isTaken(old));
     stream(fresh);
     EXPECT_EQ(source.starts, 2);
-    source.sink->take(record(1, "00"));
+    source.sink->receive(record(1, "00"));
     EXPECT_THAT(sentTo("app"), ElementsAre(record(1, "00"))) << "once";
 }
 
@@ -142,11 +142,11 @@ TEST_F(LogServerClientsTest, rememberedStatesAreBounded) {
     listen();
     stream(createChannel("one"));
     for (int code = 0; code < 100; ++code)
-        source.sink->take(record(static_cast<std::uint16_t>(code), "00", 0xFF));
-    source.sink->take(record(3, "07", 0xFF));
+        source.sink->receive(record(static_cast<std::uint16_t>(code), "00", 0xFF));
+    source.sink->receive(record(3, "07", 0xFF));
     stream(createChannel("two"));
     const auto states = sentTo("two");
-    ASSERT_EQ(states.size(), LogServer::maximumRemembered);
+    ASSERT_EQ(states.size(), LogServer::maximumCachedExtra);
     EXPECT_EQ(states[3], record(3, "07", 0xFF));
 }
 
@@ -164,7 +164,7 @@ TEST_F(LogServerClientsTest, stopClosesEverything) {
     EXPECT_EQ(source.stops, 1);
 }
 
-TEST_F(LogServerClientsTest, tellsWhenItsPortIsLost) {
+TEST_F(LogServerClientsTest, reportsALostPort) {
     listen();
     ASSERT_TRUE(ports.closeLocal(serverName));
     EXPECT_TRUE(lost);
@@ -259,7 +259,7 @@ TEST(LogServerRoomTest, waitsForASlowClientButNotForAStuckOne) {
     ports.port->waiting = 1'000'000;
     EXPECT_FALSE(source.sink->hasRoom());
     queue.advance(900ms);
-    EXPECT_FALSE(source.sink->hasRoom()) << "patience began anew";
+    EXPECT_FALSE(source.sink->hasRoom()) << "the time-out restarted";
     queue.advance(200ms);
     EXPECT_TRUE(source.sink->hasRoom()) << "it is stuck";
     ports.port->waiting = 10;

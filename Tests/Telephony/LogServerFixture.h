@@ -32,7 +32,7 @@ public:
     std::function<void()> changed;
 
     [[nodiscard]] std::string_view technology() const override { return spoken; }
-    void whenTechnologyChanges(std::function<void()> call) override { changed = std::move(call); }
+    void setTechnologyCallback(std::function<void()> call) override { changed = std::move(call); }
     void start(LogSink& to) override {
         ++starts;
         sink = &to;

@@ -38,7 +38,7 @@ TEST_F(LogServerTest, refusesAPortThatIsNotThere) {
     EXPECT_EQ(request(serverName, plist({{"CreateLogChannel", "nobody"}})), dictionary({{"Error", 1}}));
     EXPECT_EQ(server.channelCount(), 0U);
     EXPECT_FALSE(ports.isTaken("com.velmora.vox.server.channel.1"));
-    EXPECT_THAT(errors(), ElementsAre("nobody wants a log channel, but there is no such port"));
+    EXPECT_THAT(errors(), ElementsAre("nobody requests a log channel, but there is no such port"));
 }
 
 TEST_F(LogServerTest, refusesMalformedRequests) {
@@ -61,7 +61,7 @@ TEST_F(LogServerTest, refusesWhenNoChannelPortCanBeMade) {
     ports.serve("app", [](std::int32_t, const Data&, bool) { return RemotePort::Answer{}; });
     ports.failNextLocal();
     EXPECT_EQ(request(serverName, plist({{"CreateLogChannel", "app"}})), dictionary({{"Error", 4}}));
-    EXPECT_THAT(errors(), ElementsAre("app wants a log channel, but no port can be made for it"));
+    EXPECT_THAT(errors(), ElementsAre("app requests a log channel, but no port can be made for it"));
     EXPECT_EQ(ports.connectionCount("app"), 0U);
 }
 
@@ -71,7 +71,7 @@ TEST_F(LogServerTest, boundsTheChannels) {
         createChannel("app" + std::to_string(i));
     ports.serve("late", [](std::int32_t, const Data&, bool) { return RemotePort::Answer{}; });
     EXPECT_EQ(request(serverName, plist({{"CreateLogChannel", "late"}})), dictionary({{"Error", 3}}));
-    EXPECT_THAT(errors(), ElementsAre("late wants a log channel, but 64 are open already"));
+    EXPECT_THAT(errors(), ElementsAre("late requests a log channel, but 64 are open already"));
     ports.sever("app0");
     EXPECT_EQ(createChannel("late"), "com.velmora.vox.server.channel.65");
 }
@@ -88,7 +88,7 @@ TEST_F(LogServerTest, otherMessageIdsAreIgnored) {
     EXPECT_THAT(errors(), IsEmpty());
 }
 
-TEST_F(LogServerTest, tellsTheTechnology) {
+TEST_F(LogServerTest, reportsTheTechnology) {
     listen();
     const std::string channel = createChannel("app");
     EXPECT_EQ(request(channel, plist({{"GetTechnology", "GetTechnology"}})),
@@ -96,7 +96,7 @@ TEST_F(LogServerTest, tellsTheTechnology) {
     EXPECT_EQ(source.starts, 0);
 }
 
-TEST_F(LogServerTest, tellsNoTechnologyWhileTheSourceHasNone) {
+TEST_F(LogServerTest, reportsNoTechnologyWhileTheSourceHasNone) {
     listen();
     source.spoken = {};
     const std::string channel = createChannel("app");
@@ -109,12 +109,12 @@ TEST_F(LogServerTest, aChangedTechnologyClosesAllChannels) {
     const std::string streaming = createChannel("app");
     const std::string idle = createChannel("other");
     stream(streaming);
-    source.sink->take(record(0x0001, "01", 0xFF));
+    source.sink->receive(record(0x0001, "01", 0xFF));
     log.clear();
     source.spoken = kVoxLogChannelTechnology_Ostrel_LTE;
     source.changed();
     EXPECT_FALSE(ports.isTaken(streaming));
-    EXPECT_FALSE(ports.isTaken(idle)) << "its client has been told the old technology";
+    EXPECT_FALSE(ports.isTaken(idle)) << "its client was given the old technology";
     EXPECT_EQ(ports.connectionCount("app"), 0U);
     EXPECT_THAT(log.textsAt(LogPriority::Notice),
                 ElementsAre(streaming + ": closed, the technology is Ostrel_LTE now",
@@ -142,7 +142,7 @@ TEST_F(LogServerTest, aChangeWhileAMessageIsOnItsWayEndsThatToo) {
         source.changed();
         return RemotePort::Answer{};
     });
-    source.sink->take(record(0x0001, "01", 0xFF));
+    source.sink->receive(record(0x0001, "01", 0xFF));
     queue.runPending();
     EXPECT_EQ(source.stops, 1);
     EXPECT_EQ(server.channelCount(), 0U);
@@ -162,19 +162,19 @@ TEST_F(LogServerTest, streamsWhatTheFilterPasses) {
     const Data malformed = hex("01 02 03");
     const Data sim = record(0x0000, "02", 0xFF);
     for (const Data& each : {wanted, record(0x5138, "01"), malformed, sim, record(0x0001, "02", 0xFF)})
-        source.sink->take(each);
+        source.sink->receive(each);
     EXPECT_THAT(sentTo("app"), ElementsAre(wanted, malformed, sim));
 }
 
-TEST_F(LogServerTest, aNewStartCommandChangesTheFilterAndStartsNothingAnew) {
+TEST_F(LogServerTest, aNewStartCommandChangesTheFilterWithoutARestart) {
     listen();
     const std::string channel = createChannel("app");
     stream(channel);
     const Value codes(std::make_shared<Array>(Array{2}));
     ASSERT_TRUE(ports.deliver(channel, 0, plist({{"SetState", "Streaming"}, {"SetOstrelLogCodes", codes}})));
     EXPECT_EQ(source.starts, 1);
-    source.sink->take(record(1, "00"));
-    source.sink->take(record(2, "00"));
+    source.sink->receive(record(1, "00"));
+    source.sink->receive(record(2, "00"));
     EXPECT_THAT(sentTo("app"), ElementsAre(record(2, "00")));
 }
 

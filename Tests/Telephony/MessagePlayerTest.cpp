@@ -141,7 +141,7 @@ TEST_F(MessagePlayerTest, stopsFromInsideTheSink) {
     EXPECT_EQ(sink.messages.size(), 2U) << "and can be started again";
 }
 
-TEST_F(MessagePlayerTest, isGoneWithItsOwner) {
+TEST_F(MessagePlayerTest, stopsWithItsOwner) {
     auto player = std::make_unique<MessagePlayer>(queue, clock, 1);
     player->start(sink, every(1ms));
     player.reset();
@@ -162,7 +162,7 @@ TEST_F(MessagePlayerTest, aClockThatIsSetNeitherStopsNorRushesIt) {
     EXPECT_NEAR(static_cast<double>(sink.messages.size() - before), 30, 2) << "a second at most is caught up";
 }
 
-TEST_F(MessagePlayerTest, aScenarioBeginsAnewWithEachStart) {
+TEST_F(MessagePlayerTest, aScenarioRestartsWithEachStart) {
     ScenarioSource source(
         queue, clock, [] { return std::make_unique<GSMScenario>(11); }, 10);
     EXPECT_EQ(source.technology(), "kVoxLogChannelTechnology_Ostrel_GSM");

@@ -93,8 +93,8 @@ protected:
         return path;
     }
 
-    /// What the raw material of a display keeps of a message that came: none where that cannot be told apart
-    /// from what follows it.
+    /// What a display's raw messages keep of a message: none where that cannot be distinguished from what
+    /// follows it.
     [[nodiscard]] std::optional<Data> kept(const Data& message) const {
         const auto header = LogMessage::parse(message.bytes());
         if (technology == "IFX")

@@ -9,7 +9,7 @@
 #include "Recording/DLF/DLFWriter.h"
 #include "Recording/Files/DataSource.h"
 #include "Recording/OpenMessages.h"
-#include "Recording/Pcapng/RecordingWriter.h"
+#include "Recording/Pcapng/PcapngWriter.h"
 #include "Telephony/Drives/ScenarioRegistry.h"
 #include "Tests/Support/FakeClock.h"
 #include "Tests/Support/Hex.h"
@@ -24,7 +24,7 @@
 #include <string>
 #include <vector>
 
-// What every technology's drive leaves in each of the three forms, and what playing that gives.
+// Every technology's drive in each of the three forms, and the messages that replaying it sends.
 
 namespace velmora {
 namespace {
@@ -35,7 +35,7 @@ using ReplayFormsTest = ReplayFormsFixture;
 
 TEST_P(ReplayFormsTest, recording) {
     const std::string path = (directory / "drive.pcapng").string();
-    const auto writer = RecordingWriter::create(path, technology);
+    const auto writer = PcapngWriter::create(path, technology);
     ASSERT_TRUE(writer);
     std::vector<Data> messages;
     for (const ScenarioEvent& event : drive) {
@@ -112,7 +112,7 @@ TEST_P(ReplayFormsTest, snapshot) {
         }
         EXPECT_EQ(date, refresh.time);
         if (technology == "IFX") {
-            // The object of the last message, written anew.
+            // The object of the last message, serialized again.
             ASSERT_EQ(got.size(), 1u);
             EXPECT_EQ(*readPropertyList(got[0].bytes()), *readPropertyList(wanted.back().bytes()));
             EXPECT_EQ(displayOf(got), refresh.display);
@@ -146,8 +146,8 @@ TEST_P(ReplayFormsTest, dlfLogOfASnapshot) {
     EXPECT_EQ(replayed(path), wanted);
 }
 
-/// Every buffer of a long drive as the application's log has it: less its first byte, with all that is odd
-/// about the drive's messages.
+/// Every buffer of a long drive as the application's log has it: less its first byte, with all that is
+/// unusual about the drive's messages.
 TEST_P(ReplayFormsTest, dlfLogOfManyBuffers) {
     if (technology == "IFX")
         GTEST_SKIP() << "its messages are no records";
@@ -165,7 +165,7 @@ TEST_P(ReplayFormsTest, dlfLogOfManyBuffers) {
             continue;
         }
         wanted.push_back(event.message);
-        // A first message's wrong type byte is gone for good.
+        // A first message's wrong type byte is not stored.
         if (isFirst && event.message.bytes()[0] == 2)
             wanted.back() = joined(hex("01"), event.message.from(1));
     }

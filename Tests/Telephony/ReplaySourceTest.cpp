@@ -3,7 +3,7 @@
 
 #include "Telephony/Sources/ReplaySource.h"
 
-#include "Recording/Pcapng/RecordingWriter.h"
+#include "Recording/Pcapng/PcapngWriter.h"
 #include "Telephony/Sources/SourceFactory.h"
 #include "Tests/Support/CapturedLog.h"
 #include "Tests/Support/FakeMainQueue.h"
@@ -24,11 +24,11 @@ using namespace std::chrono_literals;
 using ::testing::ElementsAre;
 using ::testing::IsEmpty;
 
-/// What a file holds, as the test wants it.
+/// The content of a file, set by the test.
 struct FakeFile {
     std::string technology = "Ostrel_GSM";
     std::vector<std::pair<std::chrono::nanoseconds, Data>> messages; ///< by time since some hour
-    std::vector<Loss> losses;                                        ///< told at the end
+    std::vector<Loss> losses;                                        ///< reported at the end
     std::optional<Failure> failure;                                  ///< the end's
 };
 
@@ -169,7 +169,7 @@ TEST_F(ReplaySourceTest, timeThatRunsBackwardsIsNoTimeAndAPauseAMinuteAtMost) {
     EXPECT_EQ(sink.messages.size(), 4U);
 }
 
-TEST_F(ReplaySourceTest, tellsLossesOnce) {
+TEST_F(ReplaySourceTest, reportsLossesOnce) {
     file.messages = {{0s, hex("01")}};
     file.losses = {{100, 12, 2, "the block is damaged", false},
                    {200, 7, 4, "the file ends within a block", true}};
@@ -185,7 +185,7 @@ TEST_F(ReplaySourceTest, tellsLossesOnce) {
                     "drive.pcapng: 7 bytes left out at offset 200 (record 4): the file ends within a block"));
 }
 
-TEST_F(ReplaySourceTest, tellsTheTotalOfManyLosses) {
+TEST_F(ReplaySourceTest, reportsTheTotalOfManyLosses) {
     file.messages = {{0s, hex("01")}};
     for (int i = 0; i < 150; ++i)
         file.losses.push_back({0, 2, 1, "damaged", false});
@@ -205,7 +205,7 @@ TEST_F(ReplaySourceTest, aReadErrorEndsIt) {
                 ElementsAre("drive.pcapng: cannot be read: Input/output error"));
 }
 
-TEST_F(ReplaySourceTest, aFileThatHasGoneMeanwhileGivesALine) {
+TEST_F(ReplaySourceTest, aRemovedFileIsLogged) {
     file.messages = {{0s, hex("01")}};
     ReplaySource& replay = make();
     unreadable = true;
@@ -234,7 +234,7 @@ TEST_F(ReplaySourceTest, refusesAFileWithoutTechnology) {
                              "technology=NAME supplies it");
 }
 
-TEST_F(ReplaySourceTest, aNamedTechnologyGoesBeforeTheFiles) {
+TEST_F(ReplaySourceTest, aNamedTechnologyOverridesTheFile) {
     for (const char* const told : {"", "Ostrel_GSM"}) {
         file.technology = told;
         EXPECT_EQ(make({1, false, "Ostrel_LTE"}).technology(), "kVoxLogChannelTechnology_Ostrel_LTE");
@@ -258,7 +258,7 @@ TEST_F(ReplaySourceTest, theFactoryRefusesWhatCannotBeRead) {
 TEST_F(ReplaySourceTest, theFactoryPlaysARecording) {
     const TemporaryDirectory directory;
     const std::string path = (directory / "drive.pcapng").string();
-    const auto writer = RecordingWriter::create(path, "Ostrel_LTE");
+    const auto writer = PcapngWriter::create(path, "Ostrel_LTE");
     ASSERT_TRUE(writer);
     ASSERT_TRUE((*writer)->append(FakeClock::defaultNow(), record(0xB0E5, "01 02").bytes()));
     ASSERT_TRUE((*writer)->append(FakeClock::defaultNow() + 3s, hex("01 02 03").bytes()));

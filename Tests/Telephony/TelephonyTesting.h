@@ -24,7 +24,7 @@ public:
     bool room = true;
     std::function<void()> onTake; ///< runs after each message
 
-    void take(const Data& message) override {
+    void receive(const Data& message) override {
         messages.push_back(message);
         if (onTake)
             onTake();

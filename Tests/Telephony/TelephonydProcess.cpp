@@ -36,7 +36,7 @@ PortOptions optionsFor(const std::filesystem::path& directory) {
 } // namespace
 
 bool eventually(const std::function<bool()>& condition) {
-    // What the condition looks at may happen in another process, which wakes nobody here.
+    // The condition may change in another process, which does not wake this one.
     LoopTimer look([] {});
     look.startRepeating(std::chrono::milliseconds(1));
     return testLoop().runUntil(condition, std::chrono::seconds(30));

@@ -3,7 +3,7 @@
 
 #include "Tests/Telephony/TelephonydProcess.h"
 
-#include "Recording/Pcapng/RecordingWriter.h"
+#include "Recording/Pcapng/PcapngWriter.h"
 #include "Telephony/Drives/GSM/GSMScenario.h"
 #include "Tests/Support/FakeClock.h"
 #include "Tests/Support/Hex.h"
@@ -71,7 +71,7 @@ TEST_F(TelephonydTest, streamsTheScenarioAndStopsCleanly) {
     }
 }
 
-TEST_F(TelephonydTest, tellsTheServiceManagerWhenItIsReadyAndWhenItStops) {
+TEST_F(TelephonydTest, notifiesTheServiceManagerOfReadinessAndStop) {
     NotifySocket manager((directory / "notify").string());
     ::setenv("NOTIFY_SOCKET", manager.address().c_str(), 1);
     const auto service = start({"--source", "scenario:gsm"});
@@ -139,7 +139,7 @@ TEST_F(TelephonydTest, replaysAFileAsFastAsItsClientTakesItAndLosesNothing) {
     constexpr int count = 50'000;
     const std::string path = (directory / "drive.pcapng").string();
     std::vector<Data> wanted;
-    const auto writer = RecordingWriter::create(path, "Ostrel_LTE");
+    const auto writer = PcapngWriter::create(path, "Ostrel_LTE");
     ASSERT_TRUE(writer);
     for (int i = 0; i < count; ++i) {
         std::vector<std::uint8_t> payload(40);
@@ -165,8 +165,8 @@ TEST_F(TelephonydTest, replaysAFileAsFastAsItsClientTakesItAndLosesNothing) {
     })) << service->standardError();
 }
 
-TEST_F(TelephonydTest, replaysALogThatDoesNotTellItsTechnology) {
-    // A code of nobody's, in a log of bare records.
+TEST_F(TelephonydTest, replaysALogWithoutATechnology) {
+    // A code without subscriber, in a log of bare records.
     const Data message = recordOf(0x1375, {});
     std::vector<std::uint8_t> content;
     for (int i = 0; i < 3; ++i)
@@ -191,7 +191,7 @@ TEST_F(TelephonydTest, replaysALogThatDoesNotTellItsTechnology) {
     EXPECT_THAT(client.messages, ElementsAre(message, message, message));
 }
 
-TEST_F(TelephonydTest, aSecondServiceIsToldSo) {
+TEST_F(TelephonydTest, aSecondServiceIsRefused) {
     const auto service = start({"--source", "scenario:gsm"});
     ASSERT_TRUE(eventually([&] { return !serviceSockets().empty(); }));
     const auto second = start({"--source", "scenario:gsm"});
@@ -203,7 +203,7 @@ TEST_F(TelephonydTest, aSecondServiceIsToldSo) {
     EXPECT_TRUE(client.connect()) << "the first serves on";
 }
 
-TEST_F(TelephonydTest, badCommandLinesAndInputsAreToldApart) {
+TEST_F(TelephonydTest, badCommandLinesAndInputsHaveDifferentStatus) {
     struct Case {
         Arguments arguments;
         int status;

@@ -112,7 +112,7 @@ TEST_F(AccessibilityTest, TheBarsAreNamed) {
     busy->startAnimating();
     stage.stack->topViewController()->setToolbarItems(
         {busy, std::make_shared<LabelItem>("Connecting..."), std::make_shared<SaveButton>(nullptr)}, false);
-    settle();
+    runUntilIdle();
     QWidget* const title = find(stage.window, "velmora.title");
     EXPECT_EQ(nameOf(title), "Neighbours");
     EXPECT_EQ(QAccessible::queryAccessibleInterface(title)->role(), QAccessible::Heading);

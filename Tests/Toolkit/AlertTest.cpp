@@ -24,7 +24,7 @@ TEST(AlertTest, ItShowsAndStaysWithoutBlocking) {
     Stage stage(std::make_shared<ListPane>(numberedTexts(1)));
     stage.show();
     Alert("File Error", "Unable to write file to <disk>", "Close").show(); // and is gone
-    settle();
+    runUntilIdle();
     QMessageBox* const box = shownAlert();
     ASSERT_NE(box, nullptr);
     EXPECT_EQ(box->objectName(), "velmora.alert");
@@ -35,7 +35,7 @@ TEST(AlertTest, ItShowsAndStaysWithoutBlocking) {
     EXPECT_EQ(box->buttons()[0]->text(), "Close");
     EXPECT_EQ(box->parentWidget(), stage.window.widget());
     QTest::mouseClick(box->buttons()[0], Qt::LeftButton);
-    settle();
+    runUntilIdle();
     EXPECT_EQ(shownAlert(), nullptr);
 }
 
@@ -46,7 +46,7 @@ TEST(AlertTest, EscapeClosesIt) {
     QMessageBox* const box = shownAlert();
     ASSERT_NE(box, nullptr);
     QTest::keyClick(box, Qt::Key_Escape);
-    settle();
+    runUntilIdle();
     EXPECT_EQ(shownAlert(), nullptr);
 }
 

@@ -17,7 +17,7 @@ namespace velmora {
 namespace {
 
 QImage picture(QWidget& widget) {
-    settle();
+    runUntilIdle();
     return widget.grab().toImage();
 }
 
@@ -67,7 +67,7 @@ TEST_F(DrawingTest, ASelectedRowIsHighlightedWithItsText) {
     EXPECT_EQ(text->shownColor(), palette.color(QPalette::HighlightedText));
 }
 
-TEST_F(DrawingTest, AccessoriesStandAtTheRightEdgeBesideTheContent) {
+TEST_F(DrawingTest, AccessoriesAreAtTheRightEdgeBesideTheContent) {
     TableCell& cell = *pane.cell(0);
     const double width = cell.bounds().width;
     const auto edge = [&] { return QRect(static_cast<int>(width) - 36, 2, 34, 38); };

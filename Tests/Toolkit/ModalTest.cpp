@@ -75,7 +75,7 @@ TEST_F(ModalTest, ASheetLiesOverTheStack) {
     EXPECT_EQ(stage.stack->modalViewController(), nullptr);
     EXPECT_EQ(form->presentingViewController(), nullptr);
     EXPECT_EQ(form.use_count(), 1);
-    settle();
+    runUntilIdle();
     EXPECT_EQ(find(stage.window, "velmora.sheet"), nullptr);
 }
 
@@ -144,7 +144,7 @@ TEST_F(ModalTest, AStackBelowMayChangeWithoutTakingTheKeyboard) {
     EXPECT_TRUE(stage.stack->topViewController()->view().isFirstResponder());
 }
 
-TEST_F(ModalTest, AnAnimatedSheetComesFromBelowAndGoesThere) {
+TEST_F(ModalTest, AnAnimatedSheetSlidesInAndOutAtTheBottom) {
     const auto form = present(true);
     EXPECT_THAT(form->log, ElementsAre("will appear animated"));
     const auto top = [&] { return form->view().widget()->mapTo(stage.window.widget(), QPoint()).y(); };
@@ -157,7 +157,7 @@ TEST_F(ModalTest, AnAnimatedSheetComesFromBelowAndGoesThere) {
     const auto second = present(true); // while the first is on its way out
     EXPECT_TRUE(eventually([&] { return form->log.back() == "did disappear"; }));
     EXPECT_TRUE(eventually([&] { return second->log.back() == "did appear"; }));
-    settle();
+    runUntilIdle();
     EXPECT_EQ(watch.use_count(), 1);
 }
 
@@ -172,7 +172,7 @@ TEST_F(ModalTest, NoMotionWhereNoneIsWanted) {
 TEST_F(ModalTest, ASheetFollowsItsWindow) {
     const auto form = present();
     stage.window.widget()->resize(800, 700);
-    settle();
+    runUntilIdle();
     EXPECT_EQ(form->view().frame(), (Rect{0, 0, 560, 676}));
 }
 
@@ -185,7 +185,7 @@ TEST_F(ModalTest, AWindowMayGoWithItsSheet) {
         window.makeKeyAndVisible();
         stack->presentModalViewController(form, false);
     }
-    settle();
+    runUntilIdle();
     EXPECT_EQ(stack->modalViewController(), form);
     stack->dismissModalViewController(true);
     EXPECT_EQ(form->log.back(), "did disappear");

@@ -125,7 +125,7 @@ TEST_F(NavigationTest, TheBackButtonAndTheKeysGoBack) {
     EXPECT_THAT(titles(), ElementsAre("root"));
 }
 
-TEST_F(NavigationTest, EnterOnABackButtonThatHasTheKeyboardGoesBack) {
+TEST_F(NavigationTest, EnterOnAFocusedBackButtonPops) {
     stage.show();
     push("one");
     QWidget* const back = find(stage.window, "velmora.back");
@@ -184,7 +184,7 @@ TEST_F(NavigationTest, WhatIsOnAStackCantBePushed) {
     EXPECT_THAT(titles(), ElementsAre("root"));
 }
 
-/// With the motion that the user wants.
+/// With animations enabled.
 class NavigationMotionTest : public NavigationTest {
 protected:
     NavigationMotionTest() { qunsetenv("VELMORA_REDUCED_MOTION"); }
@@ -235,7 +235,7 @@ TEST_F(NavigationMotionTest, AWindowThatIsResizedEndsTheMovement) {
     stage.show();
     push("child", true);
     stage.window.widget()->resize(500, 604);
-    settle();
+    runUntilIdle();
     EXPECT_EQ(diary.back(), "child:did appear");
     EXPECT_EQ(stage.stack->topViewController()->view().frame(), (Rect{0, 0, 500, 552}));
 }
@@ -251,7 +251,7 @@ TEST_F(NavigationMotionTest, AStackMayGoInMidMovement) {
     window.setRootViewController(nullptr);
     stack.reset();
     EXPECT_EQ(root->navigationController(), nullptr);
-    settle();
+    runUntilIdle();
 }
 
 } // namespace

@@ -56,7 +56,7 @@ TEST_F(TableKeyboardTest, PagesAndEnds) {
     press(Qt::Key_End);
     EXPECT_EQ(focusRow(), 99U);
     EXPECT_EQ(table().contentOffset(), 100 * 44 - 552);
-    press(Qt::Key_PageUp); // twelve whole rows are a page
+    press(Qt::Key_PageUp); // twelve complete rows are a page
     EXPECT_EQ(focusRow(), 87U);
     press(Qt::Key_Home);
     EXPECT_EQ(focusRow(), 0U);
@@ -114,7 +114,7 @@ TEST_F(TableKeyboardTest, LeftAndRightMoveWhatIsTooWide) {
     EXPECT_EQ(scroller.contentOffset(), 30);
     table().reloadData(); // the same row in the same cell: the place is kept
     EXPECT_EQ(scroller.contentOffset(), 30);
-    table().setContentOffset(44); // the cell comes to stand for another row
+    table().setContentOffset(44); // the cell is reused for another row
     EXPECT_EQ(scroller.contentOffset(), 0);
 }
 
@@ -142,7 +142,7 @@ TEST_F(TableKeyboardTest, ADoubleClickIsOneTap) {
     EXPECT_EQ(pane.chosen.size(), 1U);
 }
 
-TEST_F(TableKeyboardTest, TabGoesToTheToolbarAndBack) {
+TEST_F(TableKeyboardTest, TabMovesToTheToolbarAndBack) {
     EXPECT_EQ(stage.window.widget()->focusWidget(), table().widget());
     press(Qt::Key_Tab);
     press(Qt::Key_Tab);

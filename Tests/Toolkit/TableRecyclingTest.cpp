@@ -176,7 +176,7 @@ TEST_F(TableRecyclingTest, DeselectingConcernsTheSelectedRowAlone) {
 TEST_F(TableRecyclingTest, AResizeLaysTheCellsOutAgain) {
     const double before = pane.cell(0)->bounds().width;
     stage.window.widget()->resize(300, 604);
-    settle();
+    runUntilIdle();
     EXPECT_EQ(pane.cell(0)->bounds().width, before - 100);
     EXPECT_EQ(pane.cell(0)->textLabel().frame().width, before - 100 - 20);
 }

@@ -58,7 +58,7 @@ protected:
 TEST_F(TableTouchTest, ATapSelects) {
     QTest::touchEvent(viewport(), device).press(0, QPoint(20, 60), viewport());
     QTest::touchEvent(viewport(), device).release(0, QPoint(20, 60), viewport());
-    settle();
+    runUntilIdle();
     EXPECT_THAT(pane.chosen, ElementsAre(1));
 }
 

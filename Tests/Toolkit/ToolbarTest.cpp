@@ -38,7 +38,7 @@ protected:
                     onSave();
             }));
         stage.stack->topViewController()->setToolbarItems(std::move(items), true);
-        settle();
+        runUntilIdle();
     }
     [[nodiscard]] QWidget* item(const char* name) const { return find(stage.window, name); }
 
@@ -49,7 +49,7 @@ protected:
     std::function<void()> onSave;
 };
 
-TEST_F(ToolbarTest, ItemsStandFromLeftToRight) {
+TEST_F(ToolbarTest, ItemsAreOrderedFromLeftToRight) {
     fill("Connecting...", true);
     QWidget* const toolbar = item("velmora.toolbar");
     ASSERT_NE(toolbar, nullptr);
@@ -80,7 +80,7 @@ TEST_F(ToolbarTest, AStoppedIndicatorIsHiddenAndCostsNothing) {
     EXPECT_FALSE(spinner->isTurning());
 }
 
-TEST_F(ToolbarTest, AnIndicatorStandsStillWhereNoMotionIsWanted) {
+TEST_F(ToolbarTest, AnIndicatorIsStillWithReducedMotion) {
     const ReducedMotion noMotion;
     fill("", true);
     auto* const spinner = static_cast<SpinnerWidget*>(item("velmora.busy"));
@@ -141,7 +141,7 @@ TEST_F(ToolbarTest, TheActionMayReplaceTheItems) {
     fill("text", false);
     QTest::mouseClick(item("velmora.save"), Qt::LeftButton);
     EXPECT_EQ(saves, 1);
-    settle();
+    runUntilIdle();
     EXPECT_EQ(item("velmora.save"), nullptr);
     QTest::keyClick(stage.window.widget(), Qt::Key_S, Qt::ControlModifier); // nothing to press
     EXPECT_EQ(saves, 1);
@@ -175,7 +175,7 @@ TEST_F(ToolbarTest, AStatusWithoutRoomEndsInAnEllipsis) {
     EXPECT_EQ(item("velmora.save")->geometry().right() + 1, 400 - 12);
 }
 
-TEST_F(ToolbarTest, ALabelItemIsDrawnAnewWhenItChanges) {
+TEST_F(ToolbarTest, ALabelItemIsRedrawnWhenItChanges) {
     fill("one", false);
     label->setText("two");
     EXPECT_EQ(textOf(item("velmora.status")), "two");

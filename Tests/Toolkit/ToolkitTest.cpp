@@ -17,7 +17,7 @@ bool eventually(const std::function<bool()>& done) {
     return testApplication().runUntil(done, std::chrono::seconds(10));
 }
 
-void settle() {
+void runUntilIdle() {
     QCoreApplication::sendPostedEvents();
     QCoreApplication::processEvents();
     QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete);

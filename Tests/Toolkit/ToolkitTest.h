@@ -23,20 +23,20 @@
 
 namespace velmora {
 
-/// The one of this program, on a screen that nobody sees.
+/// The one of this program, on an offscreen display.
 [[nodiscard]] Application& testApplication();
 
 /// Serves events until `done`; fails after ten seconds.
 [[nodiscard]] bool eventually(const std::function<bool()>& done);
 /// Serves what is waiting to be served.
-void settle();
+void runUntilIdle();
 
 /// The visible widget of that name in the window, or null.
 [[nodiscard]] QWidget* find(const Window& window, const char* objectName);
 /// Its text: a label's or a button's.
 [[nodiscard]] std::string textOf(const QWidget* widget);
 
-/// While it lives, the user wants no motion.
+/// Turns reduced motion on during its lifetime.
 class ReducedMotion {
 public:
     ReducedMotion();
@@ -45,7 +45,7 @@ public:
     ReducedMotion& operator=(const ReducedMotion&) = delete;
 };
 
-/// A pane whose rows are the given texts, all under one identifier; keeps what it was asked and told.
+/// A pane whose rows are the given texts, all under one identifier; records its calls.
 class ListPane : public TableViewController {
 public:
     explicit ListPane(std::vector<std::string> rowTexts, std::string_view title = {});

@@ -55,7 +55,7 @@ TEST(ViewTest, ASubviewOutlivesItsSuperview) {
         View outer;
         outer.addSubview(label);
     }
-    settle();
+    runUntilIdle();
     EXPECT_EQ(label.superview(), nullptr);
     EXPECT_EQ(label.text(), "text");
     EXPECT_NE(label.widget(), nullptr);
@@ -118,7 +118,7 @@ TEST_F(ShownView, AnActionMayDestroyItsButton) {
     screen->view().addSubview(*button);
     click({50, 25});
     EXPECT_EQ(button, nullptr);
-    settle();
+    runUntilIdle();
     EXPECT_THAT(screen->view().subviews(), IsEmpty());
 }
 

@@ -62,7 +62,7 @@ TEST(CommandLineTest, WithoutOptionsLogLinesOfErrorsGoToStandardError) {
     EXPECT_EQ(line.logLevel, 3);
 }
 
-TEST(CommandLineTest, LogOptionsStandBeforeOrAfterTheCommand) {
+TEST(CommandLineTest, LogOptionsMayPrecedeOrFollowTheCommand) {
     for (const auto& arguments :
          {std::vector<const char*>{"--log", "syslog", "--log-level", "6", "watch", "--once"},
           std::vector<const char*>{"watch", "--log", "syslog", "--once", "--log-level=6"}}) {
@@ -112,7 +112,7 @@ TEST(CommandLineTest, InfoTakesAFileAndATechnology) {
     EXPECT_EQ(info->technology, "Ostrel_LTE");
 }
 
-TEST(CommandLineTest, UsageErrorsSayWhatWasGivenAndWhatIsWanted) {
+TEST(CommandLineTest, UsageErrorsGiveTheFoundAndTheExpectedValue) {
     struct Case {
         std::vector<const char*> arguments;
         const char* message;
@@ -150,11 +150,10 @@ TEST(CommandLineTest, UsageErrorsSayWhatWasGivenAndWhatIsWanted) {
     };
     for (const Case& row : cases) {
         const CommandLine line = parse(row.arguments);
-        const auto* words = std::get_if<CommandLine::Words>(&line.command);
+        const auto* words = std::get_if<CommandLine::Notice>(&line.command);
         ASSERT_NE(words, nullptr) << row.message;
         EXPECT_EQ(words->status, 2);
-        EXPECT_EQ(words->text,
-                  std::string("velmora-log: ") + row.message + "\nvelmora-log --help tells more\n");
+        EXPECT_EQ(words->text, std::string("velmora-log: ") + row.message + "\nsee velmora-log --help\n");
     }
 }
 
@@ -187,10 +186,10 @@ TEST_F(CommandLineProgramTest, UsageErrorEndsWithTwo) {
     ToolProcess process(tool({"decode"}));
     EXPECT_EQ(process.exitStatus(), 2);
     EXPECT_EQ(process.output(), "");
-    EXPECT_EQ(process.errors(), "velmora-log: FILE is required\nvelmora-log --help tells more\n");
+    EXPECT_EQ(process.errors(), "velmora-log: FILE is required\nsee velmora-log --help\n");
 }
 
-TEST_F(CommandLineProgramTest, HelpToAFullDiskIsTold) {
+TEST_F(CommandLineProgramTest, HelpToAFullDiskIsReported) {
     ToolProcess::Setup setup = tool({"--help"});
     setup.outputFile = "/dev/full";
     ToolProcess process(setup);

@@ -12,8 +12,8 @@
 
 namespace velmora {
 
-/// A telephony service on the test's event loop that says what the test tells it to, to every client that has
-/// asked it to stream. It is gone, as one that was killed, when this ends.
+/// A telephony service on the test's event loop that sends the test's messages to every client that has
+/// started streaming. Its clients see its destruction as that of a killed service.
 class FakeLogService {
 public:
     /// `technology` is a short name.

@@ -14,7 +14,7 @@
 #include "Tests/Tools/FakeLogService.h"
 #include "Tests/Tools/ToolFixture.h"
 #include "Tools/Decode/Decoding.h"
-#include "Tools/Decode/RecordedTime.h"
+#include "Tools/Decode/RefreshTicks.h"
 #include "Tools/Report.h"
 
 #include <gmock/gmock.h>
@@ -49,7 +49,7 @@ std::string textOf(const Value& display) {
 class ShownRefreshes final : public DecodingObserver {
 public:
     std::vector<Shown> all;
-    void refreshed(Time tick, const Decoded& decoded) override {
+    void didRefresh(Time tick, const Decoded& decoded) override {
         all.push_back({tick, textOf(decoded.display)});
     }
 };
@@ -131,15 +131,16 @@ TEST_P(RoundTripTest, RecordingIsTheSameByteForByte) {
 }
 
 TEST_P(RoundTripTest, SnapshotShowsTheLastFiveRefreshes) {
-    // The messages of each refresh. Decoding anew what the last five had gives what a snapshot can show.
+    // The messages of each refresh. Decoding the messages of the last five again gives what a snapshot can
+    // show.
     struct Refresh {
         std::vector<Data> messages;
         Time tick;
     };
     std::vector<Refresh> refreshes(1);
-    RecordedTicks ticks;
+    RefreshTicks ticks;
     for (const TimedMessage& message : _drive) {
-        if (const auto tick = ticks.before(message.time)) {
+        if (const auto tick = ticks.tickBefore(message.time)) {
             refreshes.back().tick = *tick;
             refreshes.emplace_back();
         }
@@ -169,7 +170,7 @@ TEST_P(RoundTripTest, DLFLogHasTheRecords) {
         EXPECT_EQ(convert("drive.dlf"), 1) << "there is none";
         return;
     }
-    // All that a log can be followed through: a whole header, and a length field that is the length.
+    // What a log's record chain needs: a complete header, and a correct length field.
     std::vector<Data> expected;
     for (const TimedMessage& message : _drive) {
         const auto header = LogMessage::parse(message.message.bytes());

@@ -4,7 +4,7 @@
 #include "Tests/Tools/ToolFixture.h"
 
 #include "PropertyLists/PropertyList.h"
-#include "Recording/Pcapng/RecordingWriter.h"
+#include "Recording/Pcapng/PcapngWriter.h"
 
 #include <algorithm>
 #include <filesystem>
@@ -54,7 +54,7 @@ ToolTest::ToolTest() {
 
 std::vector<std::uint64_t> ToolTest::writeRecording(const std::string& name, const std::string& technology,
                                                     const std::vector<TimedMessage>& messages) const {
-    const auto writer = RecordingWriter::create(path(name), technology);
+    const auto writer = PcapngWriter::create(path(name), technology);
     if (!writer)
         throw std::runtime_error(writer.reason());
     std::vector<std::uint64_t> offsets;

@@ -186,7 +186,7 @@ void ToolProcess::stopReading() {
     _output.end.reset();
 }
 
-std::string ownWords(const std::string& errors) {
+std::string ownMessages(const std::string& errors) {
     std::istringstream lines(errors);
     std::string words;
     for (std::string line; std::getline(lines, line);)

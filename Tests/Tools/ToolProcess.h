@@ -85,6 +85,6 @@ private:
 };
 
 /// The lines of a program's standard error that are its own words, not the log's nor the console's.
-[[nodiscard]] std::string ownWords(const std::string& errors);
+[[nodiscard]] std::string ownMessages(const std::string& errors);
 
 } // namespace velmora

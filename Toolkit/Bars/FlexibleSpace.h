@@ -7,7 +7,7 @@
 
 namespace velmora {
 
-/// Takes what room the other items of the toolbar leave.
+/// Takes the space that the other items of the toolbar leave.
 class FlexibleSpace : public ToolbarItem {};
 
 } // namespace velmora

@@ -9,10 +9,10 @@ namespace velmora {
 
 class Toolbar;
 
-/// Something in a screen's toolbar. Items say what is to be shown; the toolbar that shows them draws it, and
-/// when a screen replaces its items by like ones it keeps what it has drawn: a spinning indicator turns on, a
-/// focused or half pressed button stays so. Items are shared between whoever makes them and the view
-/// controller they are set on; one item stands in one toolbar at a time.
+/// Something in a screen's toolbar. Items describe what is shown; the toolbar draws it, and when a screen
+/// replaces its items by similar ones it keeps their widgets: a spinning indicator continues, a focused or
+/// half pressed button stays so. Items are shared by their creator and the view controller; an item is in one
+/// toolbar at a time.
 class ToolbarItem {
 public:
     virtual ~ToolbarItem() = default;
@@ -21,7 +21,7 @@ public:
 
 protected:
     ToolbarItem() = default;
-    /// Has the toolbar that shows the item, if any, draw it anew.
+    /// Redraws the item in the toolbar that shows it, if any.
     void changed() const {
         if (_onChange)
             _onChange();

@@ -96,7 +96,7 @@ void NavigationController::showTop(const std::shared_ptr<ViewController>& old, b
     stackView().finish();
     old->viewWillDisappear(animated);
     announceTop(animated);
-    if (top != _panes.back()) // whoever heard of it went on from there
+    if (top != _panes.back()) // a delegate may have navigated further
         return;
     fillBars(animated);
     stackView().showPane(top->view(), &old->view(), isPush, animated, [top, old, animated] {

@@ -14,11 +14,11 @@ namespace velmora {
 class NavigationView;
 
 /// A stack of screens ("panes"), of which the top one shows, between a header (title, back button) above and,
-/// unless hidden, the top pane's toolbar below. The stack holds its panes. Operations change the stack at
-/// once; what is animated is only the picture, and only where the user wants motion. An operation cuts the
-/// animation of the one before it short.
+/// unless hidden, the top pane's toolbar below. The stack holds its panes. Operations change the stack
+/// immediately; only the drawing is animated, and only without reduced motion. An operation ends the
+/// animation of the previous one.
 ///
-/// Escape, Alt-Left and the back key of a device uncover the pane below the top.
+/// Escape, Alt-Left and the back key of a device pop the top pane.
 class NavigationController : public ViewController {
 public:
     /// Throws std::invalid_argument for no root.
@@ -30,10 +30,10 @@ public:
 
     /// Throws std::invalid_argument for null or a controller that is on a stack already.
     void pushViewController(std::shared_ptr<ViewController> viewController, bool animated);
-    /// Takes the top pane off and returns it; null when it is the root, which stays.
+    /// Pops the top pane and returns it; null when it is the root, which stays.
     std::shared_ptr<ViewController> popViewController(bool animated);
-    /// Takes off all panes above the given one and returns them, bottom first; none when that one is on top
-    /// or not on the stack. Only the uncovered pane is shown, none of those between.
+    /// Pops all panes above the given one and returns them, bottom first; none when that one is on top or not
+    /// on the stack. Only the uncovered pane is shown, none of those between.
     std::vector<std::shared_ptr<ViewController>> popToViewController(const ViewController& viewController,
                                                                      bool animated);
 
@@ -65,7 +65,7 @@ private:
     friend class ViewController;
 
     [[nodiscard]] NavigationView& stackView();
-    /// Has the top pane take the place of the old one.
+    /// Replaces the old pane by the top one.
     void showTop(const std::shared_ptr<ViewController>& old, bool isPush, bool animated);
     void announceTop(bool animated);
     void fillBars(bool animated);

@@ -34,7 +34,7 @@ ViewController::ViewController() = default;
 
 ViewController::~ViewController() {
     if (_presentation)
-        _presentation->abandon();
+        _presentation->discard();
 }
 
 View& ViewController::view() {

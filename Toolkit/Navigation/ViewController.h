@@ -16,9 +16,9 @@ namespace velmora {
 class ModalPresentation;
 class NavigationController;
 
-/// One screen: makes its view when that is first needed, and hears when it comes and goes. View controllers
-/// are shared (std::make_shared): a navigation stack holds those on it, a presenter the one it presents, a
-/// window its root. A controller owns its view.
+/// One screen: creates its view lazily, and is notified when it appears and disappears. View controllers are
+/// shared (std::make_shared): a navigation stack holds those on it, a presenter the one it presents, a window
+/// its root. A controller owns its view.
 class ViewController : public std::enable_shared_from_this<ViewController> {
 public:
     ViewController();
@@ -33,11 +33,11 @@ public:
     /// The base's notices do nothing; a subclass forwards them or not as it likes.
     virtual void viewDidLoad();
     virtual void viewWillAppear(bool animated);
-    /// Once the screen stands still in its place.
+    /// After the animation that shows the screen.
     virtual void viewDidAppear(bool animated);
     virtual void viewWillDisappear(bool animated);
     virtual void viewDidDisappear(bool animated);
-    /// Never sent: the toolkit keeps a view as long as its controller. Kept for those who forward them.
+    /// Never sent: the toolkit keeps a view as long as its controller. Kept for subclasses that forward them.
     virtual void viewDidUnload();
     virtual void didReceiveMemoryWarning();
 
@@ -55,11 +55,11 @@ public:
     [[nodiscard]] NavigationController* navigationController() const { return _navigationController; }
 
     /// Shows the other controller's view as a sheet over the window that this one is in; nothing below it can
-    /// be used until it is dismissed. What is below does not hear that it disappears. Throws std::logic_error
-    /// when this one presents another already or its view is in no window.
+    /// be used until it is dismissed. The controllers below are not notified. Throws std::logic_error when
+    /// this one presents another already or its view is in no window.
     void presentModalViewController(std::shared_ptr<ViewController> viewController, bool animated);
-    /// Takes the presented controller off; called on a presented controller, it takes that one off itself.
-    /// The controller is released once it is out of sight. Nothing when there is none.
+    /// Dismisses the presented controller; called on a presented controller, it dismisses that one itself.
+    /// The controller is released once it is off the screen. Does nothing when there is none.
     void dismissModalViewController(bool animated);
     /// The one that this one presents, or null.
     [[nodiscard]] std::shared_ptr<ViewController> modalViewController() const;
@@ -73,7 +73,7 @@ public:
 
     /// Takes the keyboard for the view.
     virtual bool becomeFirstResponder();
-    /// Gives the keyboard up if the view or something in it has it.
+    /// Releases the keyboard focus if the view or a subview has it.
     virtual bool resignFirstResponder();
 
 protected:

@@ -20,11 +20,11 @@ enum class TableCellStyle {
 
 enum class TableCellAccessory { none, disclosureIndicator, checkMark };
 
-/// One row of a table on the screen. The data source makes cells and the table keeps them, to be used for
-/// other rows when theirs leaves the screen. What a row shows goes into the content view, which takes the
-/// cell less the accessory at its right edge.
+/// One row of a table on the screen. The data source makes cells and the table keeps them for reuse when
+/// their row leaves the screen. A row's content goes into the content view, which is the cell without the
+/// accessory at its right edge.
 ///
-/// A screen reader calls a row by its accessible name or, without one, by the texts of the labels in its
+/// A row's name for screen readers is its accessible name or, without one, the texts of the labels in its
 /// content view, in the order in which they were added, with ", " between ("RSSI, -80 dBm").
 class TableCell : public View {
 public:
@@ -43,14 +43,13 @@ public:
     [[nodiscard]] TableCellAccessory accessory() const { return _accessory; }
     void setAccessory(TableCellAccessory accessory);
 
-    /// The base layout: gives the content view its frame and places the base's own texts. A cell that is
-    /// given out again has its row's size already; a fresh one is 320 x 44 until the table takes it. Called
-    /// again whenever the size or the accessory has changed, so an override that lays out from the content
-    /// view's bounds is right at any width.
+    /// The base layout: gives the content view its frame and places the base's own texts. A reused cell has
+    /// its row's size already; a fresh one is 320 x 44 until the table takes it. Called again whenever the
+    /// size or the accessory has changed, so an override that lays out from the content view's bounds is
+    /// right at any width.
     void layoutSubviews() override;
-    /// Called before a used cell is given out again. The base does nothing: the table unselects a cell, and
-    /// moves what scrolls sideways in it back to its start, when it comes to stand for another row than
-    /// before.
+    /// Called before a cell is reused. The base does nothing: the table deselects a cell, and resets its
+    /// horizontal scrolling, when it is reused for another row.
     virtual void prepareForReuse();
 
     [[nodiscard]] bool isSelected() const;

@@ -106,7 +106,7 @@ void TableView::scrollToRow(const IndexPath& indexPath) {
 }
 
 void TableView::sizeToFit() {
-    _table->loadOnce();
+    _table->loadIfNeeded();
     double height = static_cast<double>(_table->rows().total()) * rowHeight();
     if (superview())
         height = std::min(height, std::max(superview()->bounds().height - frame().y, 0.0));

@@ -20,14 +20,14 @@ class TableWidget;
 /// Rows below each other, all of one height (at least 44 points, more where the system font needs it). Only
 /// rows on the screen have cells.
 ///
-/// Recycling. Cells without a row wait under their reuse identifier, the last one to come being the first to
-/// be given out. A row that leaves the screen gives its cell there (when several leave at once, the topmost
-/// first); `reloadData` gives all of them there, the bottom row's first, and asks for the rows from the top
-/// down: so as long as rows keep their identifiers each gets back the cell it had.
+/// Recycling. Cells without a row are queued by their reuse identifier, last in, first out. A row that leaves
+/// the screen queues its cell (of several rows the topmost first); `reloadData` queues all of them, the
+/// bottom row's first, and requests the rows from the top down: so as long as rows keep their identifiers
+/// each gets back its cell.
 ///
-/// A reload keeps the place scrolled to, the row that has the focus and the selected row, as far as those
-/// rows still exist, and draws once. Arrows, Page Up/Down, Home and End move the focus row, Enter or Space
-/// selects it, left and right move what scrolls sideways in it.
+/// A reload keeps the scroll position, the focused row and the selected row, if those rows still exist, and
+/// draws once. Arrows, Page Up/Down, Home and End move the focus row, Enter or Space selects it, left and
+/// right move what scrolls sideways in it.
 class TableView : public View {
 public:
     TableView();
@@ -38,9 +38,9 @@ public:
     void setDataSource(TableViewDataSource* dataSource);
     void setDelegate(TableViewDelegate* delegate);
 
-    /// Asks the data source anew for everything.
+    /// Queries the data source again for everything.
     void reloadData();
-    /// A waiting cell that was made under the identifier, or null.
+    /// A queued cell of that identifier, or null.
     [[nodiscard]] std::shared_ptr<TableCell> dequeueReusableCell(std::string_view identifier);
 
     [[nodiscard]] std::size_t numberOfSections() const;
@@ -56,7 +56,7 @@ public:
 
     /// Null when none is.
     [[nodiscard]] IndexPath indexPathForSelectedRow() const;
-    /// Does not tell the delegate. A path that names no row selects none.
+    /// Does not notify the delegate. A path that names no row selects none.
     void selectRow(const IndexPath& indexPath, bool animated);
     /// Nothing when the row is not the selected one.
     void deselectRow(const IndexPath& indexPath, bool animated);

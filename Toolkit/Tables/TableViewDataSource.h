@@ -13,7 +13,7 @@ namespace velmora {
 class TableCell;
 class TableView;
 
-/// Says what a table shows. Outlives the table's use of it.
+/// Provides a table's content. Outlives the table's use of it.
 class TableViewDataSource {
 public:
     virtual ~TableViewDataSource() = default;

@@ -9,12 +9,12 @@ namespace velmora {
 
 class TableView;
 
-/// Hears what the user does with a table. Outlives the table's use of it.
+/// Receives the user's selections in a table. Outlives the table's use of it.
 class TableViewDelegate {
 public:
     virtual ~TableViewDelegate() = default;
-    /// The user tapped or clicked the row, or pressed Enter on it; it is the selected one by now. Nothing
-    /// unless overridden.
+    /// The user tapped or clicked the row, or pressed Enter on it; it is the selected one by now. The default
+    /// does nothing.
     virtual void didSelectRowAtIndexPath(TableView& tableView, const IndexPath& indexPath);
 };
 

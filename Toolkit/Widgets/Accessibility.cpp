@@ -89,7 +89,7 @@ public:
     void doAction(const QString& name) override {
         TableWidget* const table = tableOf(_cell);
         if (name == pressAction() && table && _cell.row)
-            table->choose(*_cell.row);
+            table->activateRow(*_cell.row);
     }
 
 private:
@@ -141,7 +141,7 @@ void announce(QWidget& widget, QAccessible::Event what) {
     QAccessible::updateAccessibility(&event);
 }
 
-bool announcementsAreHeard() {
+bool hasAnnouncementListener() {
     return theListener || QAccessible::isActive();
 }
 

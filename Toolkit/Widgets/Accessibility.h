@@ -11,17 +11,17 @@ class QWidget;
 
 namespace velmora {
 
-/// Makes tables, rows, headings, sheets and busy indicators known to screen readers as what they are. Once,
-/// by the application.
+/// Registers the accessible interfaces of tables, rows, headings, sheets and busy indicators. Called once, by
+/// the application.
 void installAccessibility();
 
-/// Tells screen readers that something happened to the widget.
+/// Announces an event of the widget to screen readers.
 void announce(QWidget& widget, QAccessible::Event what);
-/// Whether anybody hears what is announced.
-[[nodiscard]] bool announcementsAreHeard();
+/// Whether a screen reader or a test listens.
+[[nodiscard]] bool hasAnnouncementListener();
 
 using AnnouncementListener = std::function<void(QWidget& widget, QAccessible::Event what)>;
-/// Has a test hear announcements too; null ends it.
+/// Sets a test's listener; null removes it.
 void setAnnouncementListener(AnnouncementListener listener);
 
 } // namespace velmora

@@ -25,7 +25,7 @@ ModalPresentation::ModalPresentation(WindowWidget& window, std::shared_ptr<ViewC
     _panel.setHidden(false);
     _panel.addSubview(_viewController->view());
     _sheet->onResize = [this] { layout(); };
-    _sheet->onGone = [this] { _panel.widget()->setParent(nullptr); };
+    _sheet->onDestroyed = [this] { _panel.widget()->setParent(nullptr); };
     _sheet->onCancel = [this] { std::shared_ptr(_viewController)->cancelOperation(); };
     _sheet->onSave = [this] { std::shared_ptr(_viewController)->saveOperation(); };
 }
@@ -45,7 +45,7 @@ void ModalPresentation::present(bool animated) {
     _sheet->raise();
     if (!_viewController->becomeFirstResponder())
         _sheet->focusFirst();
-    _motion.start(
+    _animation.start(
         animated,
         [this](double part) {
             _shown = part;
@@ -55,7 +55,7 @@ void ModalPresentation::present(bool animated) {
 }
 
 void ModalPresentation::dismiss(bool animated) {
-    _motion.finish();
+    _animation.finish();
     _viewController->viewWillDisappear(animated);
     if (!_sheet) {
         _viewController->viewDidDisappear(animated);
@@ -64,7 +64,7 @@ void ModalPresentation::dismiss(bool animated) {
     _sheet->setPassive();
     if (_window)
         _window->returnFocus(_focusBefore);
-    _motion.start(
+    _animation.start(
         animated,
         [this](double part) {
             _shown = 1 - part;
@@ -76,7 +76,7 @@ void ModalPresentation::dismiss(bool animated) {
         });
 }
 
-void ModalPresentation::abandon() {
+void ModalPresentation::discard() {
     _viewController->_presenter = nullptr;
     removeSheet();
 }
@@ -97,7 +97,7 @@ void ModalPresentation::removeSheet() {
     if (!_sheet)
         return;
     _sheet->onResize = nullptr;
-    _sheet->onGone = nullptr;
+    _sheet->onDestroyed = nullptr;
     _sheet->onCancel = nullptr;
     _sheet->onSave = nullptr;
     _panel.widget()->setParent(nullptr);

@@ -5,7 +5,7 @@
 
 #include "Toolkit/Navigation/ViewController.h"
 #include "Toolkit/View.h"
-#include "Toolkit/Widgets/Motion.h"
+#include "Toolkit/Widgets/Animation.h"
 #include "Toolkit/Widgets/SheetWidget.h"
 #include "Toolkit/Widgets/WindowWidget.h"
 
@@ -26,8 +26,8 @@ public:
     [[nodiscard]] const std::shared_ptr<ViewController>& viewController() const { return _viewController; }
     void present(bool animated);
     void dismiss(bool animated);
-    /// The presenter is going: takes the sheet away without notice to anyone.
-    void abandon();
+    /// The presenter is being destroyed: removes the sheet without notifications.
+    void discard();
 
 private:
     void layout();
@@ -38,7 +38,7 @@ private:
     QPointer<WindowWidget> _window;
     QPointer<SheetWidget> _sheet;
     QPointer<QWidget> _focusBefore;
-    Motion _motion;
+    Animation _animation;
     double _shown = 0;
 };
 

@@ -47,7 +47,7 @@ void NavigationView::showPane(View& pane, View* old, bool isPush, bool animated,
         (isPush ? pane : *_old).widget()->raise();
         _old->widget()->setAttribute(Qt::WA_TransparentForMouseEvents);
     }
-    _motion.start(
+    _animation.start(
         animated && _old, [this](double part) { placePane(part); },
         [this, ended = std::move(atEnd)] {
             if (View* const gone = std::exchange(_old, nullptr)) {
@@ -65,7 +65,7 @@ void NavigationView::removePane() {
 }
 
 void NavigationView::finish() {
-    _motion.finish();
+    _animation.finish();
 }
 
 /// The upper one of the two travels the whole width, the lower one a third of it.

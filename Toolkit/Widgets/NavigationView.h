@@ -4,8 +4,8 @@
 #pragma once
 
 #include "Toolkit/View.h"
+#include "Toolkit/Widgets/Animation.h"
 #include "Toolkit/Widgets/HeaderBar.h"
-#include "Toolkit/Widgets/Motion.h"
 #include "Toolkit/Widgets/Toolbar.h"
 
 namespace velmora {
@@ -23,9 +23,9 @@ public:
     /// Puts the pane in the old one's place (there may be none): from the right when it is pushed, uncovered
     /// from the left otherwise. An earlier movement ends first.
     void showPane(View& pane, View* old, bool isPush, bool animated, std::function<void()> atEnd);
-    /// Leaves the place empty.
+    /// Leaves the pane area empty.
     void removePane();
-    /// Ends a movement under way.
+    /// Ends an animation in progress.
     void finish();
 
     void layoutSubviews() override;
@@ -39,7 +39,7 @@ private:
     View* _pane = nullptr;
     View* _old = nullptr;
     bool _isPush = true;
-    Motion _motion;
+    Animation _animation;
 };
 
 } // namespace velmora

@@ -3,8 +3,8 @@
 
 #include "Toolkit/Widgets/ScrollWidget.h"
 
-#include "Toolkit/Widgets/Finger.h"
 #include "Toolkit/Widgets/Tables/TableWidget.h"
+#include "Toolkit/Widgets/TouchScroll.h"
 
 #include <QScrollEvent>
 #include <QScrollPrepareEvent>
@@ -59,7 +59,7 @@ bool ScrollWidget::event(QEvent* event) {
     const bool isTouch = event->type() == QEvent::TouchBegin || event->type() == QEvent::TouchUpdate ||
                          event->type() == QEvent::TouchEnd || event->type() == QEvent::TouchCancel;
     if (isTouch && testAttribute(Qt::WA_AcceptTouchEvents) && maximumOffset() > 0) {
-        (void)followFinger(*this, *static_cast<QTouchEvent*>(event));
+        (void)scrollByTouch(*this, *static_cast<QTouchEvent*>(event));
         event->accept();
         return true;
     }

@@ -21,8 +21,8 @@ SheetWidget::SheetWidget(WindowWidget& window) : QWidget(&window) {
 }
 
 SheetWidget::~SheetWidget() {
-    if (onGone)
-        onGone();
+    if (onDestroyed)
+        onDestroyed();
 }
 
 void SheetWidget::setShade(double shade) {

@@ -19,14 +19,14 @@ public:
     ~SheetWidget() override;
 
     std::function<void()> onResize;
-    /// The window takes this along as it goes.
-    std::function<void()> onGone;
+    /// Called when the window is destroyed with this.
+    std::function<void()> onDestroyed;
     std::function<void()> onCancel;
     std::function<void()> onSave;
 
     /// 0 to 1.
     void setShade(double shade);
-    /// On its way out: lets everything through.
+    /// While it closes: passes events through.
     void setPassive();
     [[nodiscard]] bool isPassive() const { return _isPassive; }
     void focusFirst();

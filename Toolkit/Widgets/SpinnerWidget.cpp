@@ -3,7 +3,7 @@
 
 #include "Toolkit/Widgets/SpinnerWidget.h"
 
-#include "Toolkit/Widgets/Motion.h"
+#include "Toolkit/Widgets/Animation.h"
 
 #include <QPainter>
 
@@ -32,7 +32,7 @@ void SpinnerWidget::setSpinning(bool spins) {
 }
 
 void SpinnerWidget::updateTimer(bool isShown) {
-    const bool turns = _isSpinning && isShown && wantsMotion();
+    const bool turns = _isSpinning && isShown && animationsEnabled();
     if (turns && !_timer.isActive())
         _timer.start(step_ms, this);
     else if (!turns)
@@ -58,7 +58,7 @@ void SpinnerWidget::paintEvent(QPaintEvent* /*event*/) {
     painter.translate(width() / 2.0, height() / 2.0);
     QColor gray = palette().color(QPalette::WindowText);
     for (int spoke = 0; spoke < spokes; ++spoke) {
-        // The spoke at the step is the strongest, those before it fade behind it.
+        // The spoke at the step is the strongest, those before it fade out.
         const int age = (_step - spoke + spokes) % spokes;
         gray.setAlphaF(0.65F * static_cast<float>(std::max(spokes - age, 3)) / spokes);
         painter.save();

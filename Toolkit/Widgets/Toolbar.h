@@ -14,8 +14,8 @@ class QHBoxLayout;
 
 namespace velmora {
 
-/// The bar at the bottom of a navigation stack. Items that follow others of their kind take over what those
-/// have on the screen, so that a button keeps the keyboard and a half finished click.
+/// The bar at the bottom of a navigation stack. Items reuse the widgets of earlier items of their kind, so
+/// that a button keeps the focus and an unfinished click.
 class Toolbar : public QWidget {
 public:
     Toolbar();

@@ -46,7 +46,7 @@ bool WindowWidget::isBackOrCancel(const QKeyEvent& event) {
 }
 
 void WindowWidget::keyPressEvent(QKeyEvent* event) {
-    if (SheetWidget* const over = sheet()) { // nobody in it has the keyboard
+    if (SheetWidget* const over = sheet()) { // no widget in it has the keyboard focus
         QApplication::sendEvent(over, event);
         return;
     }

@@ -13,7 +13,7 @@ namespace velmora {
 
 class SheetWidget;
 
-/// A window of the program. Keys that nobody in it uses come here.
+/// A window of the program. Receives the keys that none of its children uses.
 class WindowWidget : public QWidget {
 public:
     WindowWidget();
@@ -21,12 +21,12 @@ public:
     std::function<void()> onResize;
     std::function<void()> onCancel;
     std::function<void()> onSave;
-    /// Gives the keyboard to whom it belongs when nobody has it.
+    /// Sets the default keyboard focus when no widget has it.
     std::function<void()> onFocus;
 
-    /// The topmost sheet that is not on its way out, or null.
+    /// The topmost sheet that is not closing, or null.
     [[nodiscard]] SheetWidget* sheet() const;
-    /// Gives the keyboard back to who had it before a sheet came, or to whom it belongs.
+    /// Restores the keyboard focus of before the sheet, or the default focus.
     void returnFocus(QWidget* before);
 
     /// The active window of the program, or else any that is on the screen; null when there is none.

@@ -10,9 +10,9 @@
 #include "Platform/TelephonyService.h"
 #include "PropertyLists/PropertyList.h"
 #include "Recording/DLF/DLFWriter.h"
-#include "Recording/Pcapng/RecordingWriter.h"
+#include "Recording/Pcapng/PcapngWriter.h"
 #include "Tools/Decode/Decoding.h"
-#include "Tools/Decode/RecordedTime.h"
+#include "Tools/Decode/RefreshTicks.h"
 #include "Tools/Report.h"
 #include "Tools/Technologies.h"
 
@@ -59,7 +59,7 @@ Result<bool> toRecording(MessageReader& reader, const Conversion& conversion, in
     const Result<int> own = ownDescriptor(descriptor, conversion.name);
     if (!own)
         return Failure{own.reason()};
-    const auto writer = RecordingWriter::adopt(*own, conversion.name, messages->technology);
+    const auto writer = PcapngWriter::adopt(*own, conversion.name, messages->technology);
     if (!writer)
         return Failure{writer.reason()};
     for (; messages->next; messages->advance())
@@ -82,7 +82,7 @@ Result<bool> toDLFLog(MessageReader& reader, const Conversion& conversion, int d
     if (!own)
         return Failure{own.reason()};
     // The log's own time is that of its first record, so that the same messages make the same log.
-    RecordedClock clock;
+    MessageClock clock;
     if (messages->next)
         clock.setNow(messages->next->time);
     const auto writer = DLFWriter::adopt(*own, conversion.name, clock);
@@ -93,7 +93,7 @@ Result<bool> toDLFLog(MessageReader& reader, const Conversion& conversion, int d
         if ((*writer)->hasFailed())
             return Failure{appended.reason()};
         if (!appended && (*writer)->refused() <= MessageReader::maximumLosses)
-            report(placeInFile(conversion.title, messages->next->number, messages->next->offset) +
+            report(positionInFile(conversion.title, messages->next->number, messages->next->offset) +
                    ": left out: " + appended.reason());
     }
     if (const std::uint64_t refused = (*writer)->refused(); refused > MessageReader::maximumLosses)
@@ -119,8 +119,8 @@ public:
         return !_expected || refreshes + kept >= *_expected;
     }
     [[nodiscard]] bool wantsEveryRefresh() const override { return false; }
-    void refreshed(Time refreshTick, const Decoded&) override { tick = refreshTick; }
-    void ended(const LogGenerator& decoder, const Dictionary& state) override {
+    void didRefresh(Time refreshTick, const Decoded&) override { tick = refreshTick; }
+    void didFinish(const LogGenerator& decoder, const Dictionary& state) override {
         contents = decoder.getSaveContentsFromState(state);
     }
 

@@ -17,7 +17,7 @@ namespace velmora {
 
 class WorkContext;
 
-/// The forms of a file of log messages, which its name ends in.
+/// The forms of a file of log messages, by suffix.
 enum class FileForm {
     Recording, ///< ".pcapng"
     Snapshot,  ///< ".velmora"
@@ -34,7 +34,7 @@ struct Conversion {
     FileForm form = FileForm::Recording;
     std::string title;       ///< of the input
     std::string name;        ///< of the output
-    std::string technology;  ///< before the one that the input names; empty for that one
+    std::string technology;  ///< overrides the input's; empty for the input's
     std::string description; ///< a snapshot's
     /// How many refreshes the input takes (see countRefreshes), where it could be read before: a snapshot
     /// needs the history of the last of them only, which makes it a good deal faster.

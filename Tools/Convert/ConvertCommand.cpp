@@ -3,7 +3,7 @@
 
 #include "Tools/Convert/ConvertCommand.h"
 
-#include "Platform/Linux/Files/FileDraft.h"
+#include "Platform/Linux/Files/AtomicFile.h"
 #include "Recording/OpenMessages.h"
 #include "Tools/Convert/Conversion.h"
 #include "Tools/Decode/Decoding.h"
@@ -30,7 +30,7 @@ constexpr mode_t newFileMode = 0666;
 /// The name of the file that a signal which ends the program has to remove; a signal handler needs it global.
 char nameToRemove[PATH_MAX];
 
-void removeAndEnd(int number) {
+void removeAndExit(int number) {
     ::unlink(nameToRemove);
     ::signal(number, SIG_DFL);
     ::raise(number);
@@ -43,7 +43,7 @@ public:
         if (name.size() >= sizeof nameToRemove)
             return;
         *std::copy(name.begin(), name.end(), nameToRemove) = '\0';
-        handle(removeAndEnd);
+        handle(removeAndExit);
     }
     ~RemovedWhenInterrupted() { handle(SIG_DFL); }
     RemovedWhenInterrupted(const RemovedWhenInterrupted&) = delete;
@@ -74,7 +74,7 @@ std::string whyRefused(const ConvertOptions& options) {
         return options.out + " is the input, wanted another file";
     if (!S_ISREG(out.st_mode))
         return options.out + " is no regular file";
-    return options.force ? std::string() : alreadyThere(options.out);
+    return options.force ? std::string() : fileExistsMessage(options.out);
 }
 
 /// How many refreshes the file takes; none where it is no regular file, which can be read but once.
@@ -88,19 +88,19 @@ std::optional<std::uint64_t> refreshesOf(const std::string& file) {
 
 /// Whether all of the input is in the output now.
 bool convert(const ConvertOptions& options, MessageReader& reader, const std::string& title) {
-    // Before the draft, so that an allocation that fails never leaves one on the disk.
-    FileDraft* made = nullptr;
+    // Before the output, so that an allocation that fails never leaves one on the disk.
+    AtomicFile* made = nullptr;
     WorkContext context(title, [&made] {
         if (made)
             made->discard();
     });
-    Result<FileDraft> draft = FileDraft::create(options.out, newFileMode);
-    if (!draft) {
-        report(options.out + ": " + draft.reason());
+    Result<AtomicFile> output = AtomicFile::create(options.out, newFileMode);
+    if (!output) {
+        report(options.out + ": " + output.reason());
         return false;
     }
-    made = &*draft;
-    const RemovedWhenInterrupted removed(draft->path());
+    made = &*output;
+    const RemovedWhenInterrupted removed(output->path());
     Conversion conversion;
     conversion.form = *formFromName(options.out);
     conversion.title = title;
@@ -109,16 +109,16 @@ bool convert(const ConvertOptions& options, MessageReader& reader, const std::st
     conversion.description = options.description;
     if (conversion.form == FileForm::Snapshot)
         conversion.refreshes = refreshesOf(options.file);
-    const Result<bool> converted = convertMessages(reader, conversion, draft->descriptor(), context);
+    const Result<bool> converted = convertMessages(reader, conversion, output->descriptor(), context);
     if (!converted) {
         report(converted.reason());
         return false;
     }
-    using WhereThereIsOne = FileDraft::WhereThereIsOne;
-    const auto published = draft->publish(options.force ? WhereThereIsOne::Replace : WhereThereIsOne::Refuse);
-    if (!published)
-        report(options.out + ": " + published.reason());
-    return published && *converted;
+    using IfExists = AtomicFile::IfExists;
+    const auto committed = output->commit(options.force ? IfExists::Replace : IfExists::Refuse);
+    if (!committed)
+        report(options.out + ": " + committed.reason());
+    return committed && *converted;
 }
 
 } // namespace

@@ -11,14 +11,14 @@ class App;
 
 namespace velmora {
 
-/// `velmora-log convert`: a file of log messages in another form. The new file takes its place in one step
-/// when it is whole, so that no failure leaves half of one.
+/// `velmora-log convert`: a file of log messages in another form. The new file is renamed into place when
+/// complete, so that no failure leaves part of one.
 struct ConvertOptions {
     std::string file; ///< "-" for standard input
-    /// What it becomes; precondition: it has a form, see `formFromName`.
+    /// The output; precondition: its name has a form, see `formFromName`.
     std::string out;
-    bool force = false;      ///< replace a file that is there
-    std::string technology;  ///< before the one that the file names; empty for that one
+    bool force = false;      ///< replace an existing file
+    std::string technology;  ///< overrides the file's; empty for the file's
     std::string description; ///< a snapshot's
 };
 

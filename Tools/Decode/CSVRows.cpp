@@ -17,15 +17,15 @@ CSVRows::CSVRows(Output& output, bool isLive, const DecodeOptions& options, cons
     _fileCell = cell.view();
 }
 
-void CSVRows::messageDecoded(const LoggedMessage& message, LogGenerator& decoder, Dictionary& state) {
+void CSVRows::didDecode(const LoggedMessage& message, LogGenerator& decoder, Dictionary& state) {
     if (_options.every == DecodeOptions::Every::Message)
         writeRow(message.time, decoder.display(state));
 }
 
-void CSVRows::refreshed(Time tick, const Decoded& decoded) {
+void CSVRows::didRefresh(Time tick, const Decoded& decoded) {
     if (_options.every == DecodeOptions::Every::Refresh)
         writeRow(tick, decoded.display);
-    LineWriter::refreshed(tick, decoded);
+    LineWriter::didRefresh(tick, decoded);
 }
 
 std::string CSVRows::header(const DecodeOptions& options) {

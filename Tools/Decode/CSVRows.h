@@ -17,8 +17,8 @@ public:
     [[nodiscard]] bool wantsEveryRefresh() const override {
         return _options.every == DecodeOptions::Every::Refresh;
     }
-    void messageDecoded(const LoggedMessage& message, LogGenerator& decoder, Dictionary& state) override;
-    void refreshed(Time tick, const Decoded& decoded) override;
+    void didDecode(const LoggedMessage& message, LogGenerator& decoder, Dictionary& state) override;
+    void didRefresh(Time tick, const Decoded& decoded) override;
 
     /// The first row: "time", "file" where there are several, the paths as they were given.
     [[nodiscard]] static std::string header(const DecodeOptions& options);

@@ -10,7 +10,7 @@
 #include "Tools/Decode/DecodeWriter.h"
 #include "Tools/Decode/Jobs/JobScheduler.h"
 #include "Tools/ExitStatus.h"
-#include "Tools/LogSubstitute.h"
+#include "Tools/LogOverride.h"
 #include "Tools/Output.h"
 #include "Tools/Report.h"
 #include "Tools/Text/PrintableText.h"
@@ -35,7 +35,7 @@ public:
     ShownProgress(const std::string& path, const DecodeOptions& options) {
         if (::isatty(STDERR_FILENO) == 0)
             return;
-        // On the same terminal it would stand between the lines.
+        // On the same terminal it would mix with the lines.
         if (writesAsItGoes(options) && ::isatty(STDOUT_FILENO) != 0)
             return;
         const std::optional<std::uint64_t> size = inputSize(path);

@@ -9,7 +9,7 @@ namespace velmora {
 
 class Output;
 
-/// `velmora-log decode`. The exit status. One file's trouble does not keep the others from being decoded.
+/// `velmora-log decode`. The exit status. An error in one file does not prevent decoding the others.
 [[nodiscard]] int runDecode(const DecodeOptions& options, Output& output);
 
 } // namespace velmora

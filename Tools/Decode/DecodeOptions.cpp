@@ -47,7 +47,7 @@ void checkTogether(const DecodeOptions& options) {
 } // namespace
 
 CLI::App* addDecode(CLI::App& app, DecodeOptions& options) {
-    CLI::App* command = app.add_subcommand("decode", "Show what recordings hold, as the screens would");
+    CLI::App* command = app.add_subcommand("decode", "Decode recordings and print their display");
     command->add_option("FILE", options.files, "Recordings; - is standard input")->required()->type_name("");
     command
         ->add_option_function<std::string>(
@@ -59,10 +59,11 @@ CLI::App* addDecode(CLI::App& app, DecodeOptions& options) {
                                  : name == "csv"   ? Format::Csv
                                                    : Format::Text;
             },
-            "text, unless told otherwise: the display tree in the end; json: an object in the end, with the "
-            "technology, the number of messages, and the display; jsonl: such an object with its time on a "
-            "line of its own for each refresh; csv: a row for each refresh, a column for each --select")
-        ->check(wantsOneOf({"text", "json", "jsonl", "csv"}))
+            "text (the default): the final display as a tree; json: one object with the technology, the "
+            "number "
+            "of messages and the final display; jsonl: such an object with its time for each refresh, one a "
+            "line; csv: a row for each refresh, a column for each --select")
+        ->check(oneOf({"text", "json", "jsonl", "csv"}))
         ->type_name("text|json|jsonl|csv");
     command
         ->add_option_function<std::string>(
@@ -71,31 +72,32 @@ CLI::App* addDecode(CLI::App& app, DecodeOptions& options) {
                 using Every = DecodeOptions::Every;
                 options.every = what == "message" ? Every::Message : Every::Refresh;
             },
-            "message: jsonl has an object for each message, with its code and what it concerned, and csv a "
-            "row; refresh, unless told otherwise")
-        ->check(wantsOneOf({"refresh", "message"}))
+            "message: jsonl has an object for each message, with its code and what it changed, and csv a "
+            "row; the default is refresh")
+        ->check(oneOf({"refresh", "message"}))
         ->type_name("refresh|message");
     command
         ->add_option_function<std::vector<std::string>>(
             "--select",
             [&options](const std::vector<std::string>& paths) { options.selection = NodeSelection(paths); },
-            "Only this part of the display, by the names on the screens: \"/GSM/GSM Serving Cell/RSSI\", "
-            "\"/GSM/Neighboring Cells/0\"; may be given several times")
-        ->check(wants(NodeSelection::isPath, "a path that begins with a slash"))
+            "Only this part of the display, by a path of the names on the screens: \"/GSM/GSM Serving "
+            "Cell/RSSI\", "
+            "\"/GSM/Neighboring Cells/0\"; may be repeated")
+        ->check(validator(NodeSelection::isPath, "a path that begins with a slash"))
         ->expected(1)
         ->allow_extra_args(false) // a FILE may follow
         ->multi_option_policy(CLI::MultiOptionPolicy::TakeAll)
         ->type_name("PATH");
-    addBound(*command, "--from", options.range.from, "Only messages of this time and later");
+    addBound(*command, "--from", options.range.from, "Only messages at or after this time");
     addBound(*command, "--to", options.range.to, "Only messages before this time");
     addTechnology(*command, options.technology, "Decode as");
-    command->add_option("--jobs", options.jobs, "Decode this many files side by side")
-        ->check(wantsCount())
+    command->add_option("--jobs", options.jobs, "Decode this many files in parallel")
+        ->check(positiveCount())
         ->type_name("N");
     command->footer(
-        "With several files, text is headed by the files' names, json is one object a file, one behind\n"
-        "the other, and jsonl and csv say in each line which \"file\" it is of. All JSON is laid out as\n"
-        "velmora-log.schema.json says. A cell of csv without a value is empty.\n\n"
+        "With several files, text has the files' names as headings, json is one object after another,\n"
+        "and jsonl and csv have the \"file\" in each line. All JSON conforms to velmora-log.schema.json.\n"
+        "A csv cell without a value is empty.\n\n"
         "A TIME is ISO 8601 (UTC unless it has a zone), seconds since 1970, or +SECONDS after the file's\n"
         "first message.\n\n"
         "Examples:\n"

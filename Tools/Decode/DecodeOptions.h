@@ -19,8 +19,8 @@ namespace velmora {
 /// `velmora-log decode`: runs each file through its technology's decoder and shows what the screens show.
 struct DecodeOptions {
     enum class Format {
-        Text,      ///< the display tree in the end
-        Json,      ///< an object in the end
+        Text,      ///< the final display tree
+        Json,      ///< one final object
         JsonLines, ///< an object on one line for each refresh or message
         Csv,       ///< a row for each refresh or message
     };
@@ -30,8 +30,8 @@ struct DecodeOptions {
     Every every = Every::Refresh; ///< `Message` for JsonLines and Csv alone
     NodeSelection selection;      ///< not empty for Csv; empty for JsonLines with `Message`
     TimeRange range;
-    std::string technology; ///< before the one that the file names; empty for that one
-    std::size_t jobs = 1;   ///< how many files are decoded side by side
+    std::string technology; ///< overrides the file's; empty for the file's
+    std::size_t jobs = 1;   ///< how many files are decoded in parallel
     std::vector<std::string> files;
 };
 

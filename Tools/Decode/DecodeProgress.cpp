@@ -27,28 +27,28 @@ std::string duration(std::uint64_t seconds) {
 
 } // namespace
 
-DecodeProgress::DecodeProgress(std::uint64_t size, const Clock& clock, Show show)
-    : _size(size), _clock(clock), _show(std::move(show)), _started(clock.now()), _shown(_started),
-      _nextLook(mebibyte) {
-    _show("0 %");
+DecodeProgress::DecodeProgress(std::uint64_t size, const Clock& clock, Print print)
+    : _size(size), _clock(clock), _print(std::move(print)), _started(clock.now()), _shown(_started),
+      _nextUpdate(mebibyte) {
+    _print("0 %");
 }
 
-void DecodeProgress::look(std::uint64_t offset) {
-    _nextLook = offset + mebibyte;
+void DecodeProgress::update(std::uint64_t offset) {
+    _nextUpdate = offset + mebibyte;
     const Time now = _clock.now();
     const double elapsed = std::chrono::duration<double>(now - _started).count();
     if (now - _shown < showInterval || elapsed <= 0)
         return;
     _shown = now;
-    // A file may grow while it is read, from nothing even: then there is no telling how much is left.
+    // A file may grow while it is read, even from an empty one; the rest cannot be estimated then.
     const std::uint64_t done = std::min(offset, _size);
     if (done == 0)
         return;
     const double bytesPerSecond = static_cast<double>(done) / elapsed;
     const double left = static_cast<double>(_size - done) / bytesPerSecond;
-    _show(std::to_string(static_cast<int>(100.0 * static_cast<double>(done) / static_cast<double>(_size))) +
-          " %, " + std::to_string(static_cast<std::uint64_t>(bytesPerSecond / mebibyte)) + " MiB/s, " +
-          duration(static_cast<std::uint64_t>(std::llround(left))) + " left");
+    _print(std::to_string(static_cast<int>(100.0 * static_cast<double>(done) / static_cast<double>(_size))) +
+           " %, " + std::to_string(static_cast<std::uint64_t>(bytesPerSecond / mebibyte)) + " MiB/s, " +
+           duration(static_cast<std::uint64_t>(std::llround(left))) + " left");
 }
 
 std::optional<std::uint64_t> inputSize(const std::string& path) {

@@ -21,26 +21,26 @@ public:
     /// Shorter input is done too soon for a progress line.
     static constexpr std::uint64_t smallestInput = std::uint64_t{64} << 20;
 
-    using Show = std::function<void(std::string_view line)>;
+    using Print = std::function<void(std::string_view line)>;
 
-    /// `size`: the input's, in bytes, above 0. `clock` must outlive it. Shows 0 % at once.
-    DecodeProgress(std::uint64_t size, const Clock& clock, Show show);
+    /// `size`: the input's, in bytes, above 0. `clock` must outlive it. Prints 0 % immediately.
+    DecodeProgress(std::uint64_t size, const Clock& clock, Print print);
 
     /// The input has been read up to there.
     void at(std::uint64_t offset) {
-        if (offset >= _nextLook)
-            look(offset);
+        if (offset >= _nextUpdate)
+            update(offset);
     }
 
 private:
-    void look(std::uint64_t offset);
+    void update(std::uint64_t offset);
 
     std::uint64_t _size;
     const Clock& _clock;
-    Show _show;
+    Print _print;
     Time _started;
     Time _shown;
-    std::uint64_t _nextLook;
+    std::uint64_t _nextUpdate;
 };
 
 /// The size of a regular file, "-" being standard input; absent for pipes, devices and missing files.

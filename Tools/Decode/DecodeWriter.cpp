@@ -28,7 +28,7 @@ std::unique_ptr<DecodeWriter> DecodeWriter::make(const DecodeOptions& options, c
     return std::make_unique<FinalDisplay>(output, options, std::move(heading));
 }
 
-bool DecodeWriter::hasEnough() const {
+bool DecodeWriter::isDone() const {
     return !_output.isOpen();
 }
 

@@ -26,7 +26,7 @@ public:
     virtual void finish(const Decoded&) {}
     /// Writes out what is complete, and nothing else: decoding may have ended in the middle of a message.
     virtual void flush() {}
-    [[nodiscard]] bool hasEnough() const override;
+    [[nodiscard]] bool isDone() const override;
 
 protected:
     explicit DecodeWriter(Output& output) : _output(output) {}

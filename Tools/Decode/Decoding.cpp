@@ -5,9 +5,9 @@
 
 #include "Platform/TelephonyService.h"
 #include "Tools/Decode/DecodeProgress.h"
-#include "Tools/Decode/NotedResources.h"
-#include "Tools/Decode/RecordedTime.h"
+#include "Tools/Decode/RefreshTicks.h"
 #include "Tools/Decode/Refreshes.h"
+#include "Tools/Decode/TrackedResources.h"
 #include "Tools/Report.h"
 #include "Tools/Technologies.h"
 
@@ -21,7 +21,7 @@ Result<Decoded> decodeMessages(MessageReader& reader, const DecodingRequest& req
     // The first message before the technology: a file may name it no earlier than there.
     std::optional<LoggedMessage> message = reader.next();
     const std::string& named = request.technology.empty() ? reader.technology() : request.technology;
-    RecordedClock clock;
+    MessageClock clock;
     const Result<std::unique_ptr<LogGenerator>> decoder = makeDecoder(named, clock);
     if (!decoder)
         return Failure{decoder.reason() + (named.empty() ? "; --technology supplies it" : "")};
@@ -30,7 +30,7 @@ Result<Decoded> decodeMessages(MessageReader& reader, const DecodingRequest& req
     (*decoder)->setKeepsHistory(keepsHistory);
     const bool wantsEveryRefresh = observer.wantsEveryRefresh();
 
-    const NotedResources resources;
+    const TrackedResources resources;
     Decoded decoded;
     decoded.technology = shortTechnologyName(named);
     Dictionary state;
@@ -39,10 +39,10 @@ Result<Decoded> decodeMessages(MessageReader& reader, const DecodingRequest& req
         refreshes.done();
         decoded.refreshes = refreshes.count();
         clock.setNow(tick);
-        // A refresh that nobody sees does nothing but, where there is no display yet, log why.
+        // A refresh without a reader is skipped, unless there is no display yet: then it logs the reason.
         if (keepsHistory || wantsEveryRefresh || !state.contains("Display"))
             decoded.display = (*decoder)->generateLogUsingState(state);
-        observer.refreshed(tick, decoded);
+        observer.didRefresh(tick, decoded);
         if (observer.wantsHistory(refreshes.count()) != keepsHistory) {
             keepsHistory = !keepsHistory;
             (*decoder)->setKeepsHistory(keepsHistory);
@@ -62,21 +62,21 @@ Result<Decoded> decodeMessages(MessageReader& reader, const DecodingRequest& req
             refresh(*tick);
         context.atRecord(logged.number, logged.offset);
         clock.setNow(logged.time);
-        observer.messageComes(logged);
+        observer.willDecode(logged);
         if (effects)
             (*decoder)->updateStateTelling(state, logged.message, *effects);
         else
             (*decoder)->updateState(state, logged.message);
         ++decoded.messages;
-        observer.messageDecoded(logged, **decoder, state);
+        observer.didDecode(logged, **decoder, state);
         if (const std::optional<Time> tick = refreshes.after(logged))
             refresh(*tick);
     };
     bool more = message.has_value();
-    if (more && !observer.hasEnough())
+    if (more && !observer.isDone())
         decode(*message);
     message.reset(); // releases its part of the reader's buffer
-    while (more && !observer.hasEnough()) {
+    while (more && !observer.isDone()) {
         // Constructed in place: a move of each of millions of messages would show.
         const std::optional<LoggedMessage> next = reader.next();
         more = next.has_value();
@@ -87,7 +87,7 @@ Result<Decoded> decodeMessages(MessageReader& reader, const DecodingRequest& req
         refresh(*tick);
     if (refreshes.count() != 0 && !keepsHistory && !wantsEveryRefresh)
         decoded.display = (*decoder)->display(state);
-    observer.ended(**decoder, state);
+    observer.didFinish(**decoder, state);
     if (!resources.failure().empty())
         return Failure{"decoded without its template: " + resources.failure()};
     return decoded;
@@ -95,7 +95,7 @@ Result<Decoded> decodeMessages(MessageReader& reader, const DecodingRequest& req
 
 bool reportLosses(const MessageReader& reader, const std::string& title) {
     for (const Loss& loss : reader.losses())
-        report(placeInFile(title, loss.recordNumber, loss.offset) + ": " + loss.reason);
+        report(positionInFile(title, loss.recordNumber, loss.offset) + ": " + loss.reason);
     const MessageReader::LossTotals& totals = reader.lossTotals();
     if (totals.losses > reader.losses().size())
         report(title + ": and " + std::to_string(totals.losses - reader.losses().size()) + " more, " +

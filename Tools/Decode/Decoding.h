@@ -24,7 +24,7 @@ struct Decoded {
     std::string technology; ///< the short name
     std::uint64_t messages = 0;
     std::uint64_t refreshes = 0;
-    Value display; ///< as it stands after the latest refresh; none where there was nothing to show
+    Value display; ///< after the latest refresh; none if there was none
 };
 
 /// Gets decoding's events as they happen. Displays and the state belong to the decoder: they change with the
@@ -33,30 +33,31 @@ class DecodingObserver {
 public:
     virtual ~DecodingObserver() = default;
 
-    /// A wanted message is about to be decoded.
-    virtual void messageComes(const LoggedMessage&) {}
-    /// What gets the effects of each message; asked once. Null for none, which makes decoding faster.
+    /// Called before a message in the range is decoded.
+    virtual void willDecode(const LoggedMessage&) {}
+    /// The observer of each message's effects; called once. Null for none, which makes decoding faster.
     [[nodiscard]] virtual MessageEffects* effects() { return nullptr; }
-    /// Whether the decoder keeps its history, for what a snapshot saves; asked at the beginning and after
-    /// each refresh. Decoding without is faster.
+    /// Whether the decoder keeps its history, which a snapshot saves; called at the start and after each
+    /// refresh. Decoding without is faster.
     [[nodiscard]] virtual bool wantsHistory(std::uint64_t /*refreshes*/) const { return false; }
-    /// Whether the display is wanted at each refresh, or only at the last one; asked once. Decoding without
-    /// is faster, since text is made only of what is asked for.
+    /// Whether the display is needed at each refresh, or only at the last one; called once. Decoding without
+    /// is faster, since only the requested displays are written.
     [[nodiscard]] virtual bool wantsEveryRefresh() const { return true; }
-    /// A wanted message has been decoded; `decoder.display(state)` is the display as it then stands.
-    virtual void messageDecoded(const LoggedMessage&, LogGenerator& /*decoder*/, Dictionary& /*state*/) {}
-    /// The display has been refreshed; `decoded` holds it, and what was decoded up to here.
-    virtual void refreshed(Time /*tick*/, const Decoded& /*decoded*/) {}
-    /// The last refresh has been; the state is as the decoder leaves it.
-    virtual void ended(const LogGenerator& /*decoder*/, const Dictionary& /*state*/) {}
-    /// Whether decoding may stop here; asked after every message.
-    [[nodiscard]] virtual bool hasEnough() const { return false; }
+    /// A message in the range has been decoded; `decoder.display(state)` is the display after it.
+    virtual void didDecode(const LoggedMessage&, LogGenerator& /*decoder*/, Dictionary& /*state*/) {}
+    /// Called after a refresh; `decoded` holds the display and the result so far.
+    virtual void didRefresh(Time /*tick*/, const Decoded& /*decoded*/) {}
+    /// Called after the last refresh, with the final state.
+    virtual void didFinish(const LogGenerator& /*decoder*/, const Dictionary& /*state*/) {}
+    /// Whether decoding may stop here; called after every message.
+    [[nodiscard]] virtual bool isDone() const { return false; }
 };
 
 struct DecodingRequest {
-    std::string technology; ///< before the one that the file names; empty for that one
-    TimeRange range;        ///< messages outside are passed over, as if the file did not hold them
-    DecodeProgress* progress = nullptr; ///< gets the offset of every message, wanted or not; may be null
+    std::string technology; ///< overrides the file's; empty for the file's
+    TimeRange range;        ///< messages outside are skipped
+    DecodeProgress* progress =
+        nullptr; ///< gets the offset of every message, in the range or not; may be null
 };
 
 /// Runs a file's messages through the decoder of its technology, and refreshes as the application does while

@@ -10,7 +10,7 @@
 
 namespace velmora {
 
-/// The display as it stands after the last message: a JSON object, or the display tree under a heading.
+/// The display after the last message: a JSON object, or the display tree under a heading.
 class FinalDisplay final : public DecodeWriter {
 public:
     FinalDisplay(Output& output, const DecodeOptions& options, std::string heading)

@@ -39,7 +39,7 @@ RefreshLines::RefreshLines(Output& output, bool isLive, const NodeSelection& sel
                            const std::string& file)
     : LineWriter(output, isLive), _selection(selection), _begin(beginOf(file)) {}
 
-void RefreshLines::refreshed(Time tick, const Decoded& decoded) {
+void RefreshLines::didRefresh(Time tick, const Decoded& decoded) {
     line().append(_begin);
     appendTime(tick);
     line().append("\",\"technology\":");
@@ -48,13 +48,13 @@ void RefreshLines::refreshed(Time tick, const Decoded& decoded) {
     line().append(std::to_string(decoded.messages));
     appendDisplay(line(), _selection.restricted(decoded.display));
     endLine("}\n");
-    LineWriter::refreshed(tick, decoded);
+    LineWriter::didRefresh(tick, decoded);
 }
 
 MessageLines::MessageLines(Output& output, bool isLive, const std::string& file)
     : LineWriter(output, isLive), _begin(beginOf(file)) {}
 
-void MessageLines::messageDecoded(const LoggedMessage&, LogGenerator&, Dictionary&) {
+void MessageLines::didDecode(const LoggedMessage&, LogGenerator&, Dictionary&) {
     endLine(_end);
 }
 

@@ -14,7 +14,7 @@ namespace velmora {
 class RefreshLines final : public LineWriter {
 public:
     RefreshLines(Output& output, bool isLive, const NodeSelection& selection, const std::string& file);
-    void refreshed(Time tick, const Decoded& decoded) override;
+    void didRefresh(Time tick, const Decoded& decoded) override;
 
 private:
     const NodeSelection& _selection;
@@ -26,10 +26,10 @@ private:
 class MessageLines final : public LineWriter, private MessageEffects {
 public:
     MessageLines(Output& output, bool isLive, const std::string& file);
-    void messageComes(const LoggedMessage& message) override { _moment = message.time; }
+    void willDecode(const LoggedMessage& message) override { _moment = message.time; }
     [[nodiscard]] MessageEffects* effects() override { return this; }
     [[nodiscard]] bool wantsEveryRefresh() const override { return false; }
-    void messageDecoded(const LoggedMessage& message, LogGenerator& decoder, Dictionary& state) override;
+    void didDecode(const LoggedMessage& message, LogGenerator& decoder, Dictionary& state) override;
 
 private:
     void sections(std::optional<std::uint32_t> code) override;

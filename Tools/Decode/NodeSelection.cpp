@@ -78,7 +78,7 @@ const Value* findAfter(const Value& value, std::string_view rest, bool atRoot) {
     return nullptr;
 }
 
-/// How a child stands to the paths that lead through its parent.
+/// What the paths through its parent select of a child.
 struct Share {
     bool isSelected = false; ///< all of it
     Rests inside;            ///< else these paths lead into it

@@ -5,26 +5,26 @@
 
 #include "Platform/Clock.h"
 #include "Recording/MessageReader.h"
-#include "Tools/Decode/RecordedTime.h"
+#include "Tools/Decode/RefreshTicks.h"
 
 #include <cstdint>
 #include <optional>
 
 namespace velmora {
 
-/// When a file's display is refreshed while its messages are decoded one after the other: on the grid of
-/// RecordedTicks, or where the file itself says when (a snapshot does).
+/// When a file's display is refreshed while its messages are decoded in order: on the grid of RefreshTicks,
+/// or where the file itself says when (a snapshot does).
 class Refreshes {
 public:
     /// The refresh that is due before this message is decoded, if any.
     [[nodiscard]] std::optional<Time> before(const LoggedMessage& message) {
-        _fileTells = _fileTells || message.refresh;
-        const std::optional<Time> tick = _ticks.before(message.time);
-        return tick && !_fileTells ? tick : std::nullopt;
+        _fileHasRefreshes = _fileHasRefreshes || message.refresh;
+        const std::optional<Time> tick = _ticks.tickBefore(message.time);
+        return tick && !_fileHasRefreshes ? tick : std::nullopt;
     }
-    /// The message, which is not decoded, is passed over: the refresh that is due after it, if any.
+    /// The message is skipped without being decoded: the refresh that is due after it, if any.
     [[nodiscard]] std::optional<Time> afterSkipped(const LoggedMessage& message) {
-        _fileTells = _fileTells || message.refresh;
+        _fileHasRefreshes = _fileHasRefreshes || message.refresh;
         return _isPending ? message.refresh : std::nullopt;
     }
     /// The message has been decoded: the refresh that is due after it, if any.
@@ -43,13 +43,13 @@ public:
     [[nodiscard]] std::uint64_t count() const { return _count; }
 
 private:
-    RecordedTicks _ticks;
-    bool _fileTells = false; ///< and then its refreshes are all there are
-    bool _isPending = false; ///< a message has been decoded since the last refresh
+    RefreshTicks _ticks;
+    bool _fileHasRefreshes = false; ///< if so, there are no other refreshes
+    bool _isPending = false;        ///< a message has been decoded since the last refresh
     std::uint64_t _count = 0;
 };
 
-/// How many refreshes decoding all messages takes, from where the reader stands to its end.
+/// How many refreshes decoding all messages takes, from the reader's position to its end.
 [[nodiscard]] std::uint64_t countRefreshes(MessageReader& reader);
 
 } // namespace velmora

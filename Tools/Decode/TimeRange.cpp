@@ -50,8 +50,7 @@ public:
         return number;
     }
 
-    /// "." and one to nine digits, as nanoseconds; 0 where no "." stands here. None for a "." and anything
-    /// else.
+    /// "." and one to nine digits, as nanoseconds; 0 without a ".". Absent for a "." and anything else.
     std::optional<nanoseconds> fraction() {
         if (!take('.'))
             return nanoseconds(0);

@@ -12,7 +12,7 @@
 
 namespace velmora {
 
-/// A moment as the user gives it: a time of its own, or so long after a file's first message.
+/// A time as the user gives it: absolute, or relative to a file's first message.
 struct TimeBound {
     std::chrono::nanoseconds offset{0}; ///< since 1970-01-01 00:00:00 UTC, or since the first message
     bool afterFirstMessage = false;
@@ -26,10 +26,10 @@ struct TimeBound {
 ///     1794805200.25                                                 seconds since 1970
 ///     +90.5                                                         seconds after the first message
 ///
-/// Seconds take up to nine digits of fraction. Moments before 1678 or after 2261 are refused.
+/// Seconds take up to nine digits of fraction. Times before 1678 or after 2261 are refused.
 Result<TimeBound> readTimeBound(std::string_view text);
 
-/// The messages that are wanted: those stamped at or after `from` and before `to`; absent for no bound.
+/// The selected messages: those stamped at or after `from` and before `to`; absent for no bound.
 struct TimeRange {
     std::optional<TimeBound> from;
     std::optional<TimeBound> to;
@@ -40,7 +40,7 @@ struct TimeRange {
     }
 
 private:
-    /// Cut to what a Time holds.
+    /// Clamped to the range of Time.
     [[nodiscard]] static Time momentOf(const TimeBound& bound, Time first);
 };
 

@@ -9,9 +9,9 @@
 #include "Platform/TelephonyService.h"
 #include "Recording/OpenMessages.h"
 #include "Tools/Decode/Decoding.h"
-#include "Tools/Decode/RecordedTime.h"
+#include "Tools/Decode/RefreshTicks.h"
 #include "Tools/ExitStatus.h"
-#include "Tools/Info/RecordingSummary.h"
+#include "Tools/Info/MessageSummary.h"
 #include "Tools/Output.h"
 #include "Tools/Report.h"
 #include "Tools/Technologies.h"
@@ -72,12 +72,12 @@ int runInfo(const InfoOptions& options, Output& output) {
     // The first message before the technology: a file may name it no earlier than there.
     std::optional<LoggedMessage> message = reader.next();
     const std::string technology = options.technology.empty() ? reader.technology() : options.technology;
-    RecordingSummary summary(technologyConstant(technology) != kVoxLogChannelTechnology_IFX);
+    MessageSummary summary(technologyConstant(technology) != kVoxLogChannelTechnology_IFX);
     for (; message; message = reader.next())
         summary.add(*message);
 
     // Only for its sections' names: a recording without a decoder gets its summary as well.
-    const RecordedClock clock;
+    const MessageClock clock;
     const Result<std::unique_ptr<LogGenerator>> decoder = makeDecoder(technology, clock);
     const CodeNames names = codeNames(decoder ? decoder->get() : nullptr);
     output.put(summaryText(summary, technology, names, reader));

@@ -8,7 +8,7 @@
 namespace velmora {
 
 CLI::App* addInfo(CLI::App& app, InfoOptions& options) {
-    CLI::App* command = app.add_subcommand("info", "Tell what a recording holds: times, log codes, damage");
+    CLI::App* command = app.add_subcommand("info", "List what is in a recording: times, log codes, losses");
     command->add_option("FILE", options.file, "A recording, snapshot or DLF log; - is standard input")
         ->required()
         ->type_name("");

@@ -14,7 +14,7 @@ namespace velmora {
 /// `velmora-log info`: what a file of log messages holds, and what is wrong with it.
 struct InfoOptions {
     std::string file;
-    std::string technology; ///< before the one that the file names; empty for that one
+    std::string technology; ///< overrides the file's; empty for the file's
 };
 
 /// Adds the command with its options, help and examples. Parsing fills `options`, which must outlive `app`.

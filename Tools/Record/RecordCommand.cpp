@@ -17,12 +17,12 @@ namespace {
 
 /// Reports what has been recorded, and what has not. Returns the exit status.
 int sumUp(const RecordingSession& recording, const std::string& file, int status) {
-    const recordingBlocks::PacketCount unsaved = recording.unsaved();
+    const pcapngBlocks::PacketCount unsaved = recording.unsaved();
     report("recorded " + std::to_string(recording.messages() - unsaved.messages) + " messages of " +
            recording.technology() + ", " + std::to_string(recording.bytes() - unsaved.bytes) + " bytes");
     const std::uint64_t missing = unsaved.messages + recording.dropped();
     // A pipe's reader that has closed it does not miss messages.
-    if (missing == 0 || recording.hasLostReader())
+    if (missing == 0 || recording.hasClosedReader())
         return status;
     report(std::to_string(missing) + " messages are missing from " + file);
     return ExitStatus::BadInput;
@@ -47,7 +47,7 @@ int runRecord(const RecordOptions& options) {
     ServiceClient client;
     int status = Recorder(options, recording, client).run();
     if (const Result<Done> closed = recording.close();
-        !closed && status == ExitStatus::Done && !recording.hasLostReader()) {
+        !closed && status == ExitStatus::Done && !recording.hasClosedReader()) {
         report(closed.reason());
         status = ExitStatus::BadInput;
     }

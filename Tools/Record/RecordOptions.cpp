@@ -10,8 +10,8 @@ namespace velmora {
 namespace {
 
 /// At most what the event loop's timers hold, which is 24 days.
-CLI::Validator wantsSeconds() {
-    return wants(
+CLI::Validator validSeconds() {
+    return validator(
         [](const std::string& text) {
             double seconds = 0;
             return CLI::detail::lexical_cast(text, seconds) && seconds >= 0.001 && seconds <= 2e6;
@@ -25,18 +25,17 @@ CLI::App* addRecord(CLI::App& app, RecordOptions& options) {
     CLI::App* command =
         app.add_subcommand("record", "Record the telephony service's messages until interrupted");
     command->add_option("FILE", options.file, "Where to; - is standard output")->required()->type_name("");
-    command->add_flag("--force", options.force, "Overwrite FILE where there is one");
-    command
-        ->add_option("--duration", options.duration_seconds, "Stop after this time, counted from the start")
-        ->check(wantsSeconds())
+    command->add_flag("--force", options.force, "Overwrite FILE if it exists");
+    command->add_option("--duration", options.duration_seconds, "Stop this long after the start")
+        ->check(validSeconds())
         ->type_name("SECONDS");
     command->add_option("--count", options.count, "Stop after this many messages")
-        ->check(wantsCount())
+        ->check(positiveCount())
         ->type_name("N");
     command->footer(
-        "What arrives is on its way to the disk within half a second. When FILE cannot be written or the\n"
-        "service goes away, that is told at once; up to 32 MiB of messages wait, and recording goes on\n"
-        "when it can. Messages that are missing in the end make the exit status 1.\n\n"
+        "Messages are written, and their sync to storage started, within half a second. A failed write\n"
+        "and a lost service are reported immediately; up to 32 MiB of messages are queued, and recording\n"
+        "continues when it can. The exit status is 1 if messages are missing at the end.\n\n"
         "Examples:\n"
         "  velmora-log record drive.pcapng\n"
         "  velmora-log record --duration 600 --force drive.pcapng\n"

@@ -16,7 +16,7 @@ namespace velmora {
 /// `velmora-log record`: the telephony service's messages, as they arrive, into a recording.
 struct RecordOptions {
     std::string file;   ///< "-" for standard output
-    bool force = false; ///< overwrite a file that is there
+    bool force = false; ///< overwrite an existing file
     std::optional<double> duration_seconds;
     std::optional<std::uint64_t> count; ///< messages
 };

@@ -21,7 +21,7 @@ namespace {
 
 using namespace std::chrono_literals;
 
-/// How long a message may wait before it is in the file, which leaves the medium the rest of a second.
+/// How long a message may be buffered, which leaves the rest of a second for the sync.
 constexpr auto saveInterval = 500ms;
 /// How often writing is retried while the file cannot be written, and the progress is shown.
 constexpr auto progressInterval = 1s;
@@ -59,21 +59,21 @@ int Recorder::run() {
     return status;
 }
 
-/// The service has named the technology. Whether its messages are wanted: without a decoder there is no
-/// command that would make the service send anything.
+/// The service has named the technology. Returns whether to start streaming: without a decoder there is no
+/// start command to send.
 bool Recorder::learn(std::string_view technology, bool hasDecoder) {
     if (_ended)
         return false;
     if (!hasDecoder)
         return check(Failure{"the telephony service speaks " + std::string(shortTechnologyName(technology)) +
                              ", which has no decoder here, wanted one of " + technologyNames()});
-    // It may have gone and come back between two checks.
+    // It may have ended and restarted between two checks.
     if (std::exchange(_streaming, false))
         serviceIsGone();
-    if (!check(_session.learnTechnology(technology)))
+    if (!check(_session.setTechnology(technology)))
         return false;
     if (std::exchange(_gone, false))
-        _news.tell(std::string(serviceTitle) + " is back");
+        _news.notify(std::string(serviceTitle) + " is back");
     _streaming = true;
     return true;
 }
@@ -90,14 +90,14 @@ void Recorder::save() {
     if (_ended)
         return;
     checkService();
-    if (_session.hasLostReader())
+    if (_session.hasClosedReader())
         end(ExitStatus::Done);
-    else if (_session.trouble().empty())
+    else if (_session.temporaryError().empty())
         static_cast<void>(check(_session.save()));
 }
 
 void Recorder::retry() {
-    if (!_ended && !_session.trouble().empty())
+    if (!_ended && !_session.temporaryError().empty())
         static_cast<void>(check(_session.save()));
     if (!_ended)
         showProgress();
@@ -114,20 +114,20 @@ void Recorder::checkService() {
 
 void Recorder::serviceIsGone() {
     _gone = true;
-    _news.tell(std::string(serviceTitle) + " is gone; waiting for it");
+    _news.notify(std::string(serviceTitle) + " is gone; waiting for it");
 }
 
 /// Ends the recording on a failure, after reporting it. Returns whether there was none.
 bool Recorder::check(const Result<Done>& result) {
     if (result) {
-        _news.tellTrouble();
+        _news.reportWriteError();
         return true;
     }
-    if (_session.hasLostReader()) {
+    if (_session.hasClosedReader()) {
         end(ExitStatus::Done);
         return false;
     }
-    _news.tell(result.reason());
+    _news.notify(result.reason());
     end(ExitStatus::BadInput);
     return false;
 }

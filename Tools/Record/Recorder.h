@@ -40,8 +40,8 @@ private:
     ServiceClient& _client;
     RecordingNews _news;
     std::shared_ptr<RecordingModel> _model;
-    bool _streaming = false; ///< the service has been told to send
-    bool _gone = false;      ///< the service is gone, and the user has been told
+    bool _streaming = false; ///< the start command has been sent
+    bool _gone = false;      ///< the service is gone, and that has been reported
     bool _ended = false;
 };
 

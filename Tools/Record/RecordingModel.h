@@ -18,7 +18,7 @@ class RecordingModel final : public VelmoraModel {
 public:
     struct Events {
         std::function<void(const Data& message)> message;
-        /// Whether messages of this technology, which has a decoder or none, are wanted.
+        /// Returns whether to record messages of this technology.
         std::function<bool(std::string_view technology, bool hasDecoder)> technology;
     };
 

@@ -16,7 +16,7 @@ namespace velmora {
 namespace {
 
 std::string queueSize() {
-    return std::to_string(RecordingWriter::maximumQueue >> 20) + " MiB";
+    return std::to_string(PcapngWriter::maximumQueue >> 20) + " MiB";
 }
 
 } // namespace
@@ -27,28 +27,28 @@ RecordingNews::RecordingNews(const RecordingSession& session, std::string file, 
         _progress = std::make_unique<ProgressLine>();
 }
 
-void RecordingNews::tell(const std::string& text) {
+void RecordingNews::notify(const std::string& text) {
     if (_progress)
         _progress->clear();
     report(text);
     logLine(LogPriority::Error, text);
 }
 
-void RecordingNews::tellTrouble() {
-    const bool trouble = !_session.trouble().empty();
-    if (trouble && !_toldTrouble)
-        tell(_session.trouble() + "; recording goes on when it can be, until then up to " + queueSize() +
-             " of messages wait");
-    if (_session.isDropping() && !_toldDropping)
-        tell(queueSize() + " of messages wait for " + _file + "; further ones are dropped");
-    if (!trouble && _toldTrouble) {
+void RecordingNews::reportWriteError() {
+    const bool hasError = !_session.temporaryError().empty();
+    if (hasError && !_reportedError)
+        notify(_session.temporaryError() + "; recording goes on when it can be, until then up to " +
+               queueSize() + " of messages wait");
+    if (_session.isDropping() && !_reportedDropping)
+        notify(queueSize() + " of messages wait for " + _file + "; further ones are dropped");
+    if (!hasError && _reportedError) {
         const std::uint64_t dropped = _session.dropped() - _droppedBefore;
-        tell(_file + " can be written again; " + (dropped == 0 ? "no" : std::to_string(dropped)) +
-             " messages were dropped");
+        notify(_file + " can be written again; " + (dropped == 0 ? "no" : std::to_string(dropped)) +
+               " messages were dropped");
         _droppedBefore = _session.dropped();
     }
-    _toldTrouble = trouble;
-    _toldDropping = _session.isDropping();
+    _reportedError = hasError;
+    _reportedDropping = _session.isDropping();
 }
 
 void RecordingNews::showProgress(Time now, bool isConnected) {
@@ -59,7 +59,7 @@ void RecordingNews::showProgress(Time now, bool isConnected) {
                        std::to_string(_session.bytes()) + " bytes, " + std::to_string(elapsed.count()) + " s";
     if (!isConnected)
         text += std::string("; waiting for ") + serviceTitle;
-    if (!_session.trouble().empty())
+    if (!_session.temporaryError().empty())
         text += "; " + std::to_string(_session.unsaved().messages) + " wait to be written";
     _progress->show(text);
 }

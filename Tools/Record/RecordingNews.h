@@ -3,7 +3,7 @@
 
 #pragma once
 
-#include "Tools/LogSubstitute.h"
+#include "Tools/LogOverride.h"
 #include "Tools/Record/RecordingSession.h"
 
 #include <cstdint>
@@ -12,7 +12,7 @@
 
 namespace velmora {
 
-/// What the user is told while a recording is made: messages on standard error and in the log, and a line of
+/// Reports to the user while a recording is made: messages on standard error and in the log, and a line of
 /// progress where standard error is a terminal. Main thread only.
 class RecordingNews {
 public:
@@ -20,10 +20,9 @@ public:
     RecordingNews(const RecordingSession& session, std::string file, Time started);
 
     /// A message that the user must get even without looking at the terminal: it goes to the log as well.
-    void tell(const std::string& text);
-    /// Tells each change once: trouble that has come up, messages for which there is no room, trouble that
-    /// has passed.
-    void tellTrouble();
+    void notify(const std::string& text);
+    /// Reports each change once: a temporary error, dropped messages, the end of the error.
+    void reportWriteError();
 
     void showProgress(Time now, bool isConnected);
     void endProgress() { _progress.reset(); }
@@ -33,9 +32,9 @@ private:
     std::string _file;
     Time _started;
     std::unique_ptr<ProgressLine> _progress;
-    bool _toldTrouble = false;
-    bool _toldDropping = false;
-    std::uint64_t _droppedBefore = 0; ///< in all earlier trouble
+    bool _reportedError = false;
+    bool _reportedDropping = false;
+    std::uint64_t _droppedBefore = 0; ///< in all earlier errors
 };
 
 } // namespace velmora

@@ -3,7 +3,7 @@
 
 #include "Tools/Record/RecordingSession.h"
 
-#include "Platform/Linux/Files/FileDraft.h"
+#include "Platform/Linux/Files/AtomicFile.h"
 #include "Platform/TelephonyService.h"
 #include "Tools/Report.h"
 
@@ -45,7 +45,7 @@ Result<std::unique_ptr<RecordingSession>> RecordingSession::open(const std::stri
     if (!session->_created && errno == EEXIST) {
         session->_file = FileDescriptor(::open(path.c_str(), O_WRONLY | O_CLOEXEC));
         if (session->_file.get() >= 0 && isRegularFile(session->_file.get()) && !force)
-            return Failure{alreadyThere(path)};
+            return Failure{fileExistsMessage(path)};
     }
     if (session->_file.get() < 0)
         return Failure{"cannot create " + path + ": " + std::generic_category().message(errno)};
@@ -63,7 +63,7 @@ void RecordingSession::removeIfEmpty() const {
         ::unlink(_path.c_str());
 }
 
-Result<Done> RecordingSession::learnTechnology(std::string_view technology) {
+Result<Done> RecordingSession::setTechnology(std::string_view technology) {
     const std::string_view name = shortTechnologyName(technology);
     if (_writer && name != _technology)
         return Failure{"the telephony service now speaks " + std::string(name) + ", the recording is of " +
@@ -71,36 +71,36 @@ Result<Done> RecordingSession::learnTechnology(std::string_view technology) {
     if (_writer)
         return Done{};
     // A file that is to be overwritten stays as it is until the new one has its head.
-    std::optional<FileDraft> draft;
+    std::optional<AtomicFile> file;
     if (isFilledFile(_file.get())) {
         std::error_code error;
         std::filesystem::path place = std::filesystem::canonical(_path, error); // a symbolic link stays one
         if (error)
             place = _path;
-        Result<FileDraft> made = FileDraft::create(place, newFileMode);
+        Result<AtomicFile> made = AtomicFile::create(place, newFileMode);
         if (!made)
             return Failure{_path + ": " + made.reason()};
-        draft.emplace(*std::move(made));
+        file.emplace(*std::move(made));
     }
     // The writer closes its descriptor, and so gets one of its own.
-    const int descriptor = draft ? draft->descriptor() : _file.get();
+    const int descriptor = file ? file->descriptor() : _file.get();
     const int copy = _path == "-" ? -1 : ::fcntl(descriptor, F_DUPFD_CLOEXEC, 0);
     if (_path != "-" && copy < 0)
         return Failure{"cannot write " + _path + ": " + std::generic_category().message(errno)};
-    Result<std::unique_ptr<RecordingWriter>> writer =
-        _path == "-" ? RecordingWriter::create(_path, name) : RecordingWriter::adopt(copy, _path, name);
+    Result<std::unique_ptr<PcapngWriter>> writer =
+        _path == "-" ? PcapngWriter::create(_path, name) : PcapngWriter::adopt(copy, _path, name);
     _file.reset();
     if (!writer)
         return Failure{writer.reason()};
-    if (draft) {
+    if (file) {
         if (Result<Done> written = (*writer)->flush(); !written) // the head may be waiting
             return written;
-        if (const Result<Done> published = draft->publish(FileDraft::WhereThereIsOne::Replace); !published)
-            return Failure{_path + ": " + published.reason()};
+        if (const Result<Done> committed = file->commit(AtomicFile::IfExists::Replace); !committed)
+            return Failure{_path + ": " + committed.reason()};
     }
     _writer = *std::move(writer);
     _technology = name;
-    return unlessItMayPass(_writer->flush()); // the head may be waiting
+    return keepTemporaryError(_writer->flush()); // the head may be waiting
 }
 
 Result<Done> RecordingSession::append(Time time, Bytes message) {
@@ -108,21 +108,21 @@ Result<Done> RecordingSession::append(Time time, Bytes message) {
     Result<Done> appended = _writer->append(time, message);
     if (_writer->messages() != before)
         _bytes += message.size();
-    return unlessItMayPass(std::move(appended));
+    return keepTemporaryError(std::move(appended));
 }
 
 Result<Done> RecordingSession::save() {
     if (!_writer)
         return Done{};
-    return unlessItMayPass(_writer->sync());
+    return keepTemporaryError(_writer->sync());
 }
 
-Result<Done> RecordingSession::unlessItMayPass(Result<Done> result) {
-    const bool waiting = _writer->isWaiting();
+Result<Done> RecordingSession::keepTemporaryError(Result<Done> result) {
+    const bool waiting = _writer->hasTemporaryError();
     if (!waiting)
-        _trouble.clear();
+        _temporaryError.clear();
     else if (!result)
-        _trouble = result.reason();
+        _temporaryError = result.reason();
     return waiting ? Result<Done>(Done{}) : std::move(result);
 }
 
@@ -132,7 +132,7 @@ Result<Done> RecordingSession::close() {
     return _writer->close();
 }
 
-bool RecordingSession::hasLostReader() const {
+bool RecordingSession::hasClosedReader() const {
     pollfd watched{STDOUT_FILENO, 0, 0};
     return _path == "-" && ::poll(&watched, 1, 0) > 0 && (watched.revents & POLLERR) != 0;
 }

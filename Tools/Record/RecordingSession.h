@@ -6,7 +6,7 @@
 #include "Platform/Clock.h"
 #include "Platform/Linux/Files/FileDescriptor.h"
 #include "Platform/Result.h"
-#include "Recording/Pcapng/RecordingWriter.h"
+#include "Recording/Pcapng/PcapngWriter.h"
 
 #include <cstdint>
 #include <memory>
@@ -29,36 +29,36 @@ public:
     RecordingSession(const RecordingSession&) = delete;
     RecordingSession& operator=(const RecordingSession&) = delete;
 
-    /// The service has named the technology. The first time this begins the recording; another one after that
-    /// is a failure.
-    Result<Done> learnTechnology(std::string_view technology);
-    /// A message has arrived. A failure ends the recording; an error that may pass is none (see `trouble`).
-    /// Precondition: the technology is known.
+    /// To be called when the service has named the technology. The first call starts the recording; another
+    /// technology after that is a failure.
+    Result<Done> setTechnology(std::string_view technology);
+    /// A message has arrived. A failure ends the recording; a temporary error is not a failure (see
+    /// `temporaryError`). Precondition: the technology is known.
     Result<Done> append(Time time, Bytes message);
-    /// Writes what is buffered to the file, and has the system begin to write it to the medium; nothing
-    /// before the technology is known. Retries after trouble. A failure is as above.
+    /// Writes the buffer to the file and starts its sync to storage; does nothing before the technology is
+    /// known. Retries after a temporary error. A failure is as above.
     Result<Done> save();
-    /// Ends the recording. Trouble that has not passed is a failure now.
+    /// Ends the recording. A temporary error that persists is a failure now.
     Result<Done> close();
 
     /// The technology's short name; empty while it is unknown.
     [[nodiscard]] const std::string& technology() const { return _technology; }
-    /// Messages that arrived and were not dropped, those that wait included.
+    /// Messages that arrived and were not dropped, including queued ones.
     [[nodiscard]] std::uint64_t messages() const { return _writer ? _writer->messages() : 0; }
     /// The bytes of these.
     [[nodiscard]] std::uint64_t bytes() const { return _bytes; }
     /// Those of these that are not in the file.
-    [[nodiscard]] recordingBlocks::PacketCount unsaved() const {
-        return _writer ? _writer->unsaved() : recordingBlocks::PacketCount();
+    [[nodiscard]] pcapngBlocks::PacketCount unsaved() const {
+        return _writer ? _writer->unsaved() : pcapngBlocks::PacketCount();
     }
-    /// Messages for which there was no room while the file could not be written.
+    /// Messages dropped while the file could not be written.
     [[nodiscard]] std::uint64_t dropped() const { return _writer ? _writer->droppedMessages() : 0; }
-    /// Why the file cannot be written at the moment; empty when it can. The messages wait.
-    [[nodiscard]] const std::string& trouble() const { return _trouble; }
-    /// Whether there is no more room for messages to wait.
+    /// The temporary error; empty when there is none. Messages are queued meanwhile.
+    [[nodiscard]] const std::string& temporaryError() const { return _temporaryError; }
+    /// Whether the queue is full.
     [[nodiscard]] bool isDropping() const { return _writer && _writer->isDropping(); }
     /// Whether the recording goes to a pipe whose reader has closed it.
-    [[nodiscard]] bool hasLostReader() const;
+    [[nodiscard]] bool hasClosedReader() const;
     /// Removes the file that this has created, if it is still empty: for a program that ends without
     /// destructors. Allocates nothing.
     void removeIfEmpty() const;
@@ -66,15 +66,15 @@ public:
 private:
     explicit RecordingSession(std::string path) : _path(std::move(path)) {}
 
-    /// Turns an error that may pass into success, and keeps it as the trouble.
-    [[nodiscard]] Result<Done> unlessItMayPass(Result<Done> result);
+    /// Turns a temporary error into success, and keeps its reason.
+    [[nodiscard]] Result<Done> keepTemporaryError(Result<Done> result);
 
     std::string _path;
     FileDescriptor _file;  ///< until the writer has it
-    bool _created = false; ///< the file is ours to remove
-    std::unique_ptr<RecordingWriter> _writer;
+    bool _created = false; ///< this created the file
+    std::unique_ptr<PcapngWriter> _writer;
     std::string _technology;
-    std::string _trouble;
+    std::string _temporaryError;
     std::uint64_t _bytes = 0;
 };
 

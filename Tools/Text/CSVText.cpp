@@ -12,7 +12,7 @@ namespace velmora {
 
 namespace {
 
-/// What stands in a cell as it is, quotes or not.
+/// Characters that are written unchanged, inside and outside quotes.
 bool isPlain(char character) {
     const auto byte = static_cast<unsigned char>(character);
     return byte >= 0x20 && byte < 0x7F && byte != '"' && byte != ',';

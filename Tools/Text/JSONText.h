@@ -20,8 +20,7 @@ void appendJsonString(TextBuffer& out, std::string_view text);
 /// A value on one line, without blanks.
 void appendJson(TextBuffer& out, const Value& value);
 
-/// A value indented by two blanks a level. `level` is how deep the value stands; its first line is not
-/// indented.
+/// A value indented by two blanks a level. `level` is the value's depth; its first line is not indented.
 void appendIndentedJson(TextBuffer& out, const Value& value, int level = 0);
 
 } // namespace velmora

@@ -9,21 +9,21 @@ namespace velmora {
 
 namespace {
 
-constexpr std::size_t largePiece = std::size_t{256} << 10;
+constexpr std::size_t largeAllocation = std::size_t{256} << 10;
 
 } // namespace
 
 void LineWriter::endLine(std::string_view end) {
     _lines.append(end);
     _complete = _lines.size();
-    if (_complete < largePiece)
+    if (_complete < largeAllocation)
         return;
     output().put(_lines.view());
     _lines.clear();
     _complete = 0;
 }
 
-void LineWriter::refreshed(Time, const Decoded&) {
+void LineWriter::didRefresh(Time, const Decoded&) {
     if (_isLive)
         flush();
 }

@@ -12,12 +12,11 @@
 
 namespace velmora {
 
-/// A writer of one line per refresh or message. Lines are written out in large pieces, and with `isLive`,
-/// since a reader may be waiting for them, at each refresh as well. A line that has not been ended is never
-/// written out.
+/// A writer of one line per refresh or message. Lines are written in large blocks, and with `isLive`, since a
+/// reader may be waiting for them, at each refresh as well. An incomplete line is never written.
 class LineWriter : public DecodeWriter {
 public:
-    void refreshed(Time tick, const Decoded& decoded) override;
+    void didRefresh(Time tick, const Decoded& decoded) override;
     void flush() override;
     void finish(const Decoded&) override { flush(); }
 
@@ -32,7 +31,7 @@ protected:
 private:
     bool _isLive;
     TextBuffer _lines;
-    std::size_t _complete = 0; ///< how much of it is whole lines
+    std::size_t _complete = 0; ///< how much of it is complete lines
     TimeText _time;
 };
 

@@ -17,7 +17,7 @@ struct TreeRow {
     bool isBranch = false; ///< an inner node, shown by its name alone
 };
 
-/// The rows of a tree in its order: what stands below the root, at column 0, two blanks further in a level. A
+/// The rows of a tree in its order: the root's children at column 0, each level indented by two blanks. A
 /// leaf shows its name and its value; the values of one parent begin in one column, two blanks after the
 /// longest name. The root itself, whose name is the application's, has no row; a root that is a leaf has none
 /// at all, as on the screens.

@@ -67,7 +67,7 @@ Terminal::Terminal(Events events) : _events(std::move(events)) {
         keys.c_cc[VTIME] = 0;
         ::tcsetattr(STDIN_FILENO, TCSANOW, &keys);
         _inputWatch =
-            std::make_unique<SocketWatch>(STDIN_FILENO, SocketWatch::For::Reading, [this] { takeInput(); });
+            std::make_unique<SocketWatch>(STDIN_FILENO, SocketWatch::For::Reading, [this] { handleInput(); });
     }
     writeAll(enter);
 }
@@ -84,7 +84,7 @@ void Terminal::watchSignals() {
     _signals = FileDescriptor(::signalfd(-1, &signals, SFD_CLOEXEC | SFD_NONBLOCK));
     if (_signals.get() >= 0)
         _signalWatch = std::make_unique<SocketWatch>(_signals.get(), SocketWatch::For::Reading,
-                                                     [this] { takeSignal(); });
+                                                     [this] { handleSignal(); });
 }
 
 ScreenSize Terminal::size() const {
@@ -107,7 +107,7 @@ void Terminal::restore() {
         ::tcsetattr(STDIN_FILENO, TCSANOW, &_earlier);
 }
 
-void Terminal::takeInput() {
+void Terminal::handleInput() {
     char bytes[256];
     const ssize_t count = ::read(STDIN_FILENO, bytes, sizeof bytes);
     if (count > 0) {
@@ -118,7 +118,7 @@ void Terminal::takeInput() {
     }
 }
 
-void Terminal::takeSignal() {
+void Terminal::handleSignal() {
     signalfd_siginfo info = {};
     if (::read(_signals.get(), &info, sizeof info) != static_cast<ssize_t>(sizeof info))
         return;

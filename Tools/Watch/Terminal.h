@@ -23,7 +23,7 @@ public:
     struct Events {
         std::function<void(std::string_view bytes)> input;
         std::function<void()> resized;
-        std::function<void()> hungUp; ///< the terminal is gone
+        std::function<void()> hungUp; ///< the terminal has been closed
     };
 
     [[nodiscard]] static bool isThere();
@@ -36,13 +36,13 @@ public:
     [[nodiscard]] ScreenSize size() const;
     /// One write.
     void draw(std::string_view frame);
-    /// Puts the terminal back as it was; nothing more is drawn after that.
+    /// Restores the terminal; nothing is drawn after that.
     void restore();
 
 private:
     void watchSignals();
-    void takeInput();
-    void takeSignal();
+    void handleInput();
+    void handleSignal();
 
     Events _events;
     bool _active = true;

@@ -39,12 +39,12 @@ inline constexpr std::size_t columnGap = 3;
 
 [[nodiscard]] ScreenLayout layoutOf(const std::vector<TreeRow>& rows, ScreenSize size);
 
-/// The bytes that draw the screen anew, over whatever it shows: no part of it is blank in between. `scroll`
-/// is the first row shown; one past the layout's maximum counts as the maximum.
+/// The bytes that redraw the screen in place, without clearing any part in between. `scroll` is the first row
+/// shown; one past the layout's maximum counts as the maximum.
 [[nodiscard]] std::string composeFrame(const std::vector<TreeRow>& rows, std::string_view status,
                                        ScreenSize size, std::size_t scroll);
 
-/// Where the screen is scrolled to after a key. `Quit` scrolls nowhere.
+/// The scroll position after a key. `Quit` does not scroll.
 [[nodiscard]] std::size_t scrolledBy(Key key, std::size_t scroll, const ScreenLayout& layout);
 
 } // namespace velmora

@@ -4,7 +4,7 @@
 #include "Tools/Watch/WatchCommand.h"
 
 #include "Platform/DateText.h"
-#include "Platform/Linux/Files/LargeMemory.h"
+#include "Platform/Linux/Files/LargeAllocations.h"
 #include "Platform/Linux/SignalWatcher.h"
 #include "Tools/ExitStatus.h"
 #include "Tools/Output.h"
@@ -65,7 +65,7 @@ public:
     int run() {
         const WorkContext context(serviceTitle, [this] {
             _model->destroyPorts();
-            _view->leave();
+            _view->restoreTerminal();
         });
         const SignalWatcher signals([this](int) { _client.loop.quit(ExitStatus::Done); });
         _client.queue.async([this] { _model->restartMonitor(); });
@@ -126,7 +126,7 @@ private:
 } // namespace
 
 int runWatch(const WatchOptions& options, Output& output) {
-    giveBackLargeMemory();
+    returnLargeAllocations();
     ServiceClient client;
     const int status = Watcher(options, output, client).run();
     return output.state() == Output::State::Failed ? ExitStatus::BadInput : status;

@@ -9,10 +9,10 @@ namespace velmora {
 
 CLI::App* addWatch(CLI::App& app, WatchOptions& options) {
     CLI::App* command = app.add_subcommand("watch", "Show what the telephony service reports, live");
-    command->add_flag("--once", options.once, "Print the first refresh and end");
+    command->add_flag("--once", options.once, "Print the first refresh and exit");
     command->footer(
         "On a terminal the screen is redrawn in place: arrows, j, k, PgUp, PgDn, Home and End scroll,\n"
-        "q ends. On a pipe each refresh is printed in turn.\n\n"
+        "q quits. On a pipe each refresh is printed, one after another.\n\n"
         "Examples:\n"
         "  velmora-log watch\n"
         "  velmora-log watch --once | grep -A20 'Serving Cell'");

@@ -23,9 +23,10 @@ void PipeView::showStatus(const std::string& status) {
 }
 
 ScreenView::ScreenView(std::function<void()> quit)
-    : _quit(std::move(quit)), _heldLog(::isatty(STDERR_FILENO) != 0 ? std::make_unique<HeldLog>() : nullptr),
-      _terminal(
-          {[this](std::string_view bytes) { takeInput(bytes); }, [this] { draw(); }, [this] { _quit(); }}) {}
+    : _quit(std::move(quit)),
+      _deferredLog(::isatty(STDERR_FILENO) != 0 ? std::make_unique<DeferredLog>() : nullptr),
+      _terminal({[this](std::string_view bytes) { handleInput(bytes); }, [this] { draw(); },
+                 [this] { _quit(); }}) {}
 
 void ScreenView::showRefresh(const std::string& status, std::vector<TreeRow> rows) {
     _status = status;
@@ -38,13 +39,13 @@ void ScreenView::showStatus(const std::string& status) {
     draw();
 }
 
-void ScreenView::leave() {
+void ScreenView::restoreTerminal() {
     _terminal.restore();
-    if (_heldLog)
-        _heldLog->release();
+    if (_deferredLog)
+        _deferredLog->release();
 }
 
-void ScreenView::takeInput(std::string_view bytes) {
+void ScreenView::handleInput(std::string_view bytes) {
     const std::size_t before = _scroll;
     for (const Key key : _keys.take(bytes)) {
         if (key == Key::Quit) {

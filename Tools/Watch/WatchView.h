@@ -3,7 +3,7 @@
 
 #pragma once
 
-#include "Tools/LogSubstitute.h"
+#include "Tools/LogOverride.h"
 #include "Tools/Output.h"
 #include "Tools/Text/TreeText.h"
 #include "Tools/Watch/Terminal.h"
@@ -21,21 +21,21 @@ public:
     virtual ~WatchView() = default;
     /// A refresh: the status line and the display tree's rows.
     virtual void showRefresh(const std::string& status, std::vector<TreeRow> rows) = 0;
-    /// The connection is lost, or there again; the rows are as they were.
+    /// The connection is lost or re-established; the rows are unchanged.
     virtual void showStatus(const std::string& status) = 0;
     /// Whether there is still a reader or a terminal.
     [[nodiscard]] virtual bool isOpen() const = 0;
     /// Restores the terminal, if one is in use.
-    virtual void leave() {}
+    virtual void restoreTerminal() {}
 };
 
-/// Prints each refresh in turn, headed by the status line, a blank line between two.
+/// Prints each refresh after its status line, a blank line between two.
 class PipeView final : public WatchView {
 public:
     explicit PipeView(Output& output) : _output(output) {}
     void showRefresh(const std::string& status, std::vector<TreeRow> rows) override;
     void showStatus(const std::string& status) override;
-    [[nodiscard]] bool isOpen() const override { return _output.isOpen() && !_output.hasLostReader(); }
+    [[nodiscard]] bool isOpen() const override { return _output.isOpen() && !_output.hasClosedReader(); }
 
 private:
     Output& _output;
@@ -46,20 +46,20 @@ private:
 /// restored.
 class ScreenView final : public WatchView {
 public:
-    /// `quit` is called when the user wants to end, or the terminal is gone.
+    /// `quit` is called when the user quits or the terminal has been closed.
     explicit ScreenView(std::function<void()> quit);
     void showRefresh(const std::string& status, std::vector<TreeRow> rows) override;
     void showStatus(const std::string& status) override;
     [[nodiscard]] bool isOpen() const override { return true; }
-    void leave() override;
+    void restoreTerminal() override;
 
 private:
-    void takeInput(std::string_view bytes);
+    void handleInput(std::string_view bytes);
     void draw();
 
     std::function<void()> _quit;
-    std::unique_ptr<HeldLog>
-        _heldLog; ///< declared before the terminal: its lines come after the screen is restored
+    std::unique_ptr<DeferredLog>
+        _deferredLog; ///< declared before the terminal: its lines come after the screen is restored
     Terminal _terminal;
     KeyReader _keys;
     std::string _status;

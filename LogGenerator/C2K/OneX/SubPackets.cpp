@@ -11,7 +11,7 @@ namespace {
 
 constexpr std::size_t countAt = 14;
 constexpr std::size_t firstAt = 17;
-/// How far behind the record's end a sub-packet must not end. Generous, on purpose.
+/// How far past the record's end a sub-packet may not end. The tolerance is intended.
 constexpr std::size_t endTolerance = 17;
 
 } // namespace

@@ -10,7 +10,7 @@
 
 namespace velmora::C2K {
 
-/// What a search for a sub-packet came to.
+/// The result of a search for a sub-packet.
 struct FoundSubPacket {
     enum class Outcome : std::uint8_t {
         Found,
@@ -34,9 +34,9 @@ public:
     /// Precondition: the record has the minimum length.
     explicit SubPackets(const Record& record) : _record(record) {}
 
-    /// The first sub-packet of that id. One that ends 17 bytes or more behind the record's end is an error in
-    /// size: an error line, whatever its id, and the search is over. (One that ends less far behind it is
-    /// taken, on purpose; what it needs is for `reaches` to say.)
+    /// The first sub-packet of that id. One that ends 17 bytes or more past the record's end is an error in
+    /// size: an error line, whatever its id, and the search is over. (One that ends less far past it is
+    /// accepted, as intended; `reaches` checks what it needs.)
     [[nodiscard]] FoundSubPacket find(std::uint8_t id) const;
 
     /// Whether the record holds the first `length` bytes from the sub-packet's start on; an error line where

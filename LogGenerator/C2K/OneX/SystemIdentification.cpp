@@ -45,7 +45,7 @@ constexpr ValueField zone[] = {
     {"kPacketZoneId", u8At(131), integer("%d")},
 };
 constexpr ValueField baseStation[] = {
-    {"kBaseId", u16At(184), integer("%d")}, // behind the minimum length
+    {"kBaseId", u16At(184), integer("%d")}, // past the minimum length
 };
 constexpr ValueField revision[] = {
     {"kProtocolRevision", u8At(133), integer("%d")},

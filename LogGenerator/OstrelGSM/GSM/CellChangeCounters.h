@@ -7,7 +7,7 @@
 
 namespace velmora {
 
-/// "Cell Change Counters": wants no code; it is there so that the display shows a section of this name.
+/// "Cell Change Counters": has no codes; it exists so that the display shows a section of this name.
 class CellChangeCounters final : public Base {
 public:
     [[nodiscard]] std::string_view getSectionName() const override { return "Cell Change Counters"; }

@@ -7,7 +7,7 @@
 
 namespace velmora {
 
-/// "Coding Scheme": wants no code; it is there so that the display shows a section of this name.
+/// "Coding Scheme": has no codes; it exists so that the display shows a section of this name.
 class CodingScheme final : public Base {
 public:
     [[nodiscard]] std::string_view getSectionName() const override { return "Coding Scheme"; }

@@ -7,7 +7,7 @@
 
 namespace velmora {
 
-/// "Non-Ranked UMTS Set": wants no code; it is there so that the display shows a section of this name.
+/// "Non-Ranked UMTS Set": has no codes; it exists so that the display shows a section of this name.
 class NonRankedUMTSSet final : public Base {
 public:
     [[nodiscard]] std::string_view getSectionName() const override { return "Non-Ranked UMTS Set"; }

@@ -7,7 +7,7 @@
 
 namespace velmora {
 
-/// "UMTS RR Measurement": wants no code; it is there so that the display shows a section of this name.
+/// "UMTS RR Measurement": has no codes; it exists so that the display shows a section of this name.
 class UMTSRRMeasurement final : public Base {
 public:
     [[nodiscard]] std::string_view getSectionName() const override { return "UMTS RR Measurement"; }

@@ -9,7 +9,7 @@
 
 namespace velmora {
 
-/// Owns a file descriptor and closes it. Move-only; -1 stands for none.
+/// Owns a file descriptor and closes it. Move-only; -1 means none.
 class FileDescriptor {
 public:
     FileDescriptor() = default;

@@ -4,8 +4,8 @@
 #include "Platform/Linux/Files/Files.h"
 
 #include "Platform/Linux/Errno.h"
+#include "Platform/Linux/Files/AtomicFile.h"
 #include "Platform/Linux/Files/FileDescriptor.h"
-#include "Platform/Linux/Files/FileDraft.h"
 
 #include <fcntl.h>
 #include <sys/stat.h>
@@ -22,8 +22,7 @@ Result<Data> readFile(const std::filesystem::path& path, std::size_t maximumByte
     FileDescriptor file(::open(path.c_str(), O_RDONLY | O_CLOEXEC));
     if (!file)
         return Failure{"cannot be opened: " + errnoText(errno)};
-    // The size that the system gives is no promise: read until the end, one byte past what is allowed at
-    // most.
+    // The reported size may be wrong: read until the end, at most one byte more than allowed.
     std::vector<std::uint8_t> content;
     std::size_t size = 0;
     for (;;) {
@@ -64,12 +63,12 @@ Result<Done> writeFile(const std::filesystem::path& path, Bytes content) {
 }
 
 Result<Done> replaceFile(const std::filesystem::path& path, Bytes content) {
-    Result<FileDraft> draft = FileDraft::create(path, S_IRUSR | S_IWUSR);
-    if (!draft)
-        return Failure{draft.reason()};
-    if (auto written = writeAll(draft->descriptor(), content); !written)
+    Result<AtomicFile> file = AtomicFile::create(path, S_IRUSR | S_IWUSR);
+    if (!file)
+        return Failure{file.reason()};
+    if (auto written = writeAll(file->descriptor(), content); !written)
         return written;
-    return draft->publish(FileDraft::WhereThereIsOne::Replace);
+    return file->commit(AtomicFile::IfExists::Replace);
 }
 
 } // namespace velmora

@@ -9,22 +9,22 @@
 
 namespace velmora {
 
-/// The machine's files, with a system root put before the paths that the platform fixes: for tests, and for
+/// The machine's files, with a system root as prefix of the paths that the platform fixes: for tests, and for
 /// machines that have no such tree.
 class LinuxFileSystem final : public FileSystem {
 public:
     struct Options {
         /// Put before absolute paths; empty for none.
         std::filesystem::path sysroot;
-        /// Where snapshots go, as it stands; empty for the standard place: $XDG_STATE_HOME/velmora
+        /// The snapshots' directory, used unchanged; empty for the default: $XDG_STATE_HOME/velmora
         /// (~/.local/state/velmora) under the system root.
         std::filesystem::path logDirectory;
     };
 
     explicit LinuxFileSystem(Options options = {});
 
-    /// Makes the standard directory for snapshots where it is missing. One that was named is its user's
-    /// business and is left alone. The reason names the directory.
+    /// Creates the default directory for snapshots if it is missing; one that the user named is not created.
+    /// The reason names the directory.
     Result<Done> makeStandardLogDirectory() const;
 
     [[nodiscard]] bool exists(std::string_view absolutePath) const override;

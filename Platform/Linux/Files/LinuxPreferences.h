@@ -15,14 +15,14 @@ namespace velmora {
 
 /// Preferences that are property lists, one a domain, in the user's configuration directory
 /// (DIRECTORY/com.velmora.HomeScreen.plist). A list keeps its form, its other keys, its permissions, and its
-/// place where it is a symbolic link; one that cannot be read is left as it is.
+/// target where it is a symbolic link; one that cannot be read is not changed.
 ///
 /// A change is announced on the session's message bus, where there is one, by the signal
 /// `PreferencesChanged(string domain, string key)` of the interface "com.velmora.Preferences" from the object
 /// "/com/velmora/Preferences".
 class LinuxPreferences final : public Preferences {
 public:
-    /// `directory` empty stands for $XDG_CONFIG_HOME (~/.config), `busAddress` empty for the session's bus.
+    /// An empty `directory` means $XDG_CONFIG_HOME (~/.config), an empty `busAddress` the session's bus.
     explicit LinuxPreferences(std::filesystem::path directory = {}, std::string busAddress = {});
 
     void setBoolean(std::string_view domain, std::string_view key, bool value) override;
@@ -34,7 +34,7 @@ private:
 
     std::filesystem::path _directory;
     std::string _busAddress;
-    /// What has been set and not been written yet, by domain.
+    /// Values that are set but not written yet, by domain.
     std::map<std::string, Dictionary, std::less<>> _changes;
 };
 

@@ -40,7 +40,7 @@ Result<FrameHeader> decodeFrameHeader(Bytes bytes) {
     const std::uint32_t flags = u32(bytes, 8);
     const std::uint32_t kind = flags & kindBits;
     const bool hasData = (flags & noDataBit) == 0;
-    // What the flags say is looked at first: in a stream that has lost its step the length means nothing.
+    // The flags are checked first: in a stream that is out of step the length is meaningless.
     if ((kind != 1 && kind != 2 && kind != 4) || (flags & ~(kindBits | noDataBit)) != 0 ||
         (!hasData && kind != static_cast<std::uint32_t>(FrameKind::Reply))) {
         char text[80];

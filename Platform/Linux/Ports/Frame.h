@@ -12,15 +12,14 @@
 
 namespace velmora {
 
-/// What a frame is for; exactly one of these bits is set in its flags.
+/// The purpose of a frame; exactly one of these bits is set in its flags.
 enum class FrameKind : std::uint32_t {
-    Request = 1, ///< a reply with the same serial is wanted
+    Request = 1, ///< a reply with the same serial is expected
     Reply = 2,   ///< carries the serial of its request
-    OneWay = 4,  ///< nothing comes back
+    OneWay = 4,  ///< no reply
 };
 
-/// A message as it travels through a port's socket: a header of 16 bytes and the payload. All numbers are
-/// little-endian.
+/// A message on a port's socket: a header of 16 bytes and the payload. All numbers are little-endian.
 ///
 ///     offset 0   u32  payload length, at most `maximumFramePayload`
 ///            4   i32  message id
@@ -53,7 +52,7 @@ using FrameHeaderBytes = std::array<std::uint8_t, frameHeaderSize>;
 /// Precondition: the payload is not above the maximum.
 [[nodiscard]] FrameHeaderBytes encodeFrameHeader(const Frame& frame);
 
-/// Precondition: `bytes` holds at least a header. The failure says what was found and what is wanted.
+/// Precondition: `bytes` holds at least a header. The failure gives the found and the expected value.
 Result<FrameHeader> decodeFrameHeader(Bytes bytes);
 
 } // namespace velmora

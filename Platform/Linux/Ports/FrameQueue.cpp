@@ -18,7 +18,7 @@ constexpr std::size_t maximumFlush = std::size_t{1} << 20;
 constexpr std::size_t piecesPerCall = 256;
 
 /// What is left of a piece whose first `skipped` bytes are written; takes those off `skipped`.
-iovec pieceAfter(Bytes piece, std::size_t& skipped) {
+iovec restOfBuffer(Bytes piece, std::size_t& skipped) {
     const std::size_t skip = std::min(skipped, piece.size());
     skipped -= skip;
     const Bytes rest = piece.subspan(skip);
@@ -29,7 +29,7 @@ iovec pieceAfter(Bytes piece, std::size_t& skipped) {
 } // namespace
 
 std::size_t FrameQueue::push(const Frame& frame) {
-    pushRegardless(frame);
+    pushUnbounded(frame);
     std::size_t dropped = 0;
     while (_waiting.size() > _limits.messages || _bytes > _limits.bytes) {
         if (_waiting.size() == 1 && _written > 0)
@@ -42,12 +42,12 @@ std::size_t FrameQueue::push(const Frame& frame) {
     return dropped;
 }
 
-void FrameQueue::pushRegardless(const Frame& frame) {
+void FrameQueue::pushUnbounded(const Frame& frame) {
     _waiting.push_back({encodeFrameHeader(frame), frame.payload});
     _bytes += _waiting.back().size();
 }
 
-bool FrameQueue::withdrawNewest() {
+bool FrameQueue::removeNewest() {
     if (_waiting.empty() || (_waiting.size() == 1 && _written > 0))
         return false;
     _bytes -= _waiting.back().size();
@@ -61,7 +61,7 @@ void FrameQueue::dropOldest() {
     _waiting.erase(oldest);
 }
 
-void FrameQueue::taken(std::size_t count) {
+void FrameQueue::consume(std::size_t count) {
     _written += count;
     while (!_waiting.empty() && _written >= _waiting.front().size()) {
         _written -= _waiting.front().size();
@@ -83,7 +83,7 @@ FrameQueue::Flushed FrameQueue::flush(int descriptor) {
             if (count + 2 > pieces.size() || bytes >= maximumFlush)
                 break;
             for (const Bytes piece : {Bytes(waiting.header), waiting.payload.bytes()}) {
-                pieces[count] = pieceAfter(piece, skipped);
+                pieces[count] = restOfBuffer(piece, skipped);
                 bytes += pieces[count].iov_len;
                 if (pieces[count].iov_len > 0)
                     ++count;
@@ -95,7 +95,7 @@ FrameQueue::Flushed FrameQueue::flush(int descriptor) {
         const auto written = ::sendmsg(descriptor, &message, MSG_NOSIGNAL | MSG_DONTWAIT);
         if (written >= 0) {
             total += static_cast<std::size_t>(written);
-            taken(static_cast<std::size_t>(written));
+            consume(static_cast<std::size_t>(written));
         } else if (errno == EAGAIN || errno == EWOULDBLOCK) {
             return Flushed::WouldBlock;
         } else if (errno != EINTR) {

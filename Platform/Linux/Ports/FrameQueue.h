@@ -10,8 +10,8 @@
 
 namespace velmora {
 
-/// Frames that wait to be written to a stream socket. The queue is bounded: what does not fit any more pushes
-/// out the oldest frames, always whole ones and never one that is partly written.
+/// Frames that are queued for a stream socket. The queue is bounded: when it is full the oldest frames are
+/// dropped, always complete ones and never one that is partly written.
 class FrameQueue {
 public:
     struct Limits {
@@ -20,7 +20,7 @@ public:
     };
     enum class Flushed {
         All,        ///< nothing waits
-        Some,       ///< as much was written as one call writes; more can be at once
+        Some,       ///< one call's maximum was written; more can follow immediately
         WouldBlock, ///< the socket takes no more for now
         Broken,     ///< the connection has ended
     };
@@ -32,17 +32,17 @@ public:
     /// the oldest that is not partly written, and so be dropped. Precondition: the payload is not above the
     /// maximum.
     [[nodiscard]] std::size_t push(const Frame& frame);
-    /// Appends the frame whatever the limits say. Same precondition.
-    void pushRegardless(const Frame& frame);
-    /// Takes the newest frame back; false when part of it is written already, so that it has to follow whole.
-    bool withdrawNewest();
+    /// Appends the frame regardless of the limits. Same precondition.
+    void pushUnbounded(const Frame& frame);
+    /// Removes the newest frame; false when part of it is already written, so that the rest has to follow.
+    bool removeNewest();
 
     /// Writes what the non-blocking socket takes, several frames a system call, a mebibyte or so a call.
     [[nodiscard]] Flushed flush(int descriptor);
 
     [[nodiscard]] bool empty() const { return _waiting.empty(); }
     [[nodiscard]] std::size_t size() const { return _waiting.size(); }
-    /// Bytes that wait, those of a partly written frame counted whole.
+    /// Queued bytes; a partly written frame counts with its full size.
     [[nodiscard]] std::size_t bytes() const { return _bytes; }
 
 private:
@@ -54,7 +54,7 @@ private:
 
     /// Drops the oldest frame that is not partly written. Precondition: there is one.
     void dropOldest();
-    void taken(std::size_t count);
+    void consume(std::size_t count);
 
     Limits _limits;
     std::deque<Waiting> _waiting;

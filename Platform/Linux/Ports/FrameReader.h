@@ -10,9 +10,9 @@
 
 namespace velmora {
 
-/// Puts frames together from the bytes of a stream socket, however they were cut on the way. What it holds
-/// grows with the bytes that have arrived, never with what a header announces, and is at most one frame and
-/// one read.
+/// Assembles frames from the bytes of a stream socket, however these were split in transit. Its memory grows
+/// with the bytes that have arrived, never with the length in a header, and is at most one frame and one
+/// read.
 class FrameReader {
 public:
     enum class Outcome { Some, WouldBlock, Ended };
@@ -27,8 +27,8 @@ public:
     /// Takes bytes as if they had been read.
     void append(Bytes bytes);
 
-    /// The next frame, or none while it has not arrived whole. A header that cannot be is a failure, and
-    /// stays one: nothing after it can be told apart.
+    /// The next frame, or none while it is incomplete. An invalid header is a failure, and remains one: no
+    /// frame boundary after it can be found.
     [[nodiscard]] Result<std::optional<Frame>> next();
 
     /// Bytes of memory that the reader holds.

@@ -189,7 +189,7 @@ LinuxLocalPort::Served LinuxLocalPort::serve(const Connection& connection, Budge
         return Served::Closed;
     };
     while (budget.messages > 0 && budget.bytes > 0) {
-        if (connection->isClogged())
+        if (connection->hasReplyBacklog())
             return Served::Idle; // comes back once its replies are taken
         auto next = connection->next();
         if (!next)

@@ -20,15 +20,15 @@ namespace velmora {
 /// A local port: a listening Unix-domain socket named after the port, and the connections that it has
 /// accepted.
 ///
-/// Messages are taken in slices: at most 256 messages or a mebibyte a turn of the event loop for the whole
-/// port, connections taking turns, so that no flood starves the rest of the program. Held by shared_ptr; the
-/// callback may invalidate the port or drop the last reference, after which no message is delivered any more.
-/// Destroying the port closes it without calling the invalidation callback. Main thread only, on its event
-/// loop.
+/// Messages are processed in batches: at most 256 messages or a mebibyte per iteration of the event loop for
+/// the port, round robin over its connections, so that no flood starves the rest of the program. Held by
+/// shared_ptr; the callback may invalidate the port or drop the last reference, after which no message is
+/// delivered any more. Destroying the port closes it without calling the invalidation callback. Main thread
+/// only, on its event loop.
 class LinuxLocalPort final : public LocalPort, public std::enable_shared_from_this<LinuxLocalPort> {
 public:
-    /// Takes the name and listens; null when the name's owner lives. The failure says what the system
-    /// refused.
+    /// Takes the name and listens; null when the name has a live owner. The failure names the system call's
+    /// error.
     static Result<std::shared_ptr<LinuxLocalPort>>
     create(const std::string& name, MessagePorts::MessageCallback callback, const PortOptions& options);
 
@@ -52,7 +52,7 @@ private:
                    PortDirectory directory, PortNameLock lock, FileDescriptor socket);
 
     void acceptConnections();
-    /// What accept(2) failed with; true when it can go on at once.
+    /// Handles accept(2)'s error; true when it can be called again immediately.
     bool handleAcceptError(int error);
     void admit(FileDescriptor socket);
     void queue(const Connection& connection);
@@ -74,7 +74,7 @@ private:
     LoopTimer _acceptPause;
     LoopTimer _serve;
     std::vector<Connection> _connections;
-    std::deque<Connection> _queued; ///< those that may have something to read, in turn
+    std::deque<Connection> _queued; ///< those that may have something to read, in round-robin order
     LogLimiter _refusals{std::chrono::minutes(1)};
 };
 

@@ -13,8 +13,8 @@ namespace velmora {
 
 namespace {
 
-/// What stands for a port whose name is taken: it never was valid, gets no message, and leaves the owner
-/// alone.
+/// Returned for a port whose name is taken: it is invalid from the start, gets no message, and does not
+/// affect the name's owner.
 class TakenLocalPort final : public LocalPort {
 public:
     explicit TakenLocalPort(std::string name) : _name(std::move(name)) {}

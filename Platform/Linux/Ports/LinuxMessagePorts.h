@@ -9,7 +9,7 @@
 namespace velmora {
 
 /// Message ports over Unix-domain stream sockets in one directory of the user's, served by the main thread's
-/// event loop. The ports live on without it. What the system refuses is an error line.
+/// event loop. The ports live on without it. A failed system call is an error line.
 class LinuxMessagePorts final : public MessagePorts {
 public:
     explicit LinuxMessagePorts(PortOptions options = {});

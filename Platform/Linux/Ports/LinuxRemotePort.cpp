@@ -79,7 +79,7 @@ Result<std::shared_ptr<LinuxRemotePort>> LinuxRemotePort::connect(const std::str
     int error = connectTo(address, socket.get());
     // A socket without a listener is what a crash leaves. A new owner removes it before it makes its own.
     const auto deadline =
-        deadlineAfter(error == ECONNREFUSED ? options.restartPatience : SteadyClock::duration::zero());
+        deadlineAfter(error == ECONNREFUSED ? options.restartTimeout : SteadyClock::duration::zero());
     while ((error == ECONNREFUSED || error == ENOENT) && SteadyClock::now() < deadline) {
         std::this_thread::sleep_for(restartPollInterval);
         error = connectTo(address, socket.get());
@@ -100,7 +100,7 @@ Result<std::shared_ptr<LinuxRemotePort>> LinuxRemotePort::connect(const std::str
 LinuxRemotePort::LinuxRemotePort(std::string name, FileDescriptor socket, const PortOptions& options)
     : _name(std::move(name)), _socket(std::move(socket)), _queue(options.queue),
       _readWatch(std::make_unique<SocketWatch>(_socket.get(), SocketWatch::For::Reading,
-                                               [this] { takeWhatArrived(); })),
+                                               [this] { readAvailable(); })),
       _writeWatch(std::make_unique<SocketWatch>(_socket.get(), SocketWatch::For::Writing,
                                                 [this] {
                                                     _blocked = false;
@@ -176,7 +176,7 @@ std::int32_t LinuxRemotePort::sendNow(const Frame& frame, Deadline deadline) {
     bool queued = false;
     for (;;) {
         if (!queued && _queue.empty()) {
-            _queue.pushRegardless(frame);
+            _queue.pushUnbounded(frame);
             queued = true;
         }
         switch (_queue.flush(_socket.get())) {
@@ -192,7 +192,7 @@ std::int32_t LinuxRemotePort::sendNow(const Frame& frame, Deadline deadline) {
                 break;
             // A frame that is partly written has to follow whole; its reply will be a late one.
             if (queued)
-                _queue.withdrawNewest();
+                _queue.removeNewest();
             _blocked = true;
             _writeWatch->setEnabled(!_queue.empty());
             return PortStatus::SendTimeout;
@@ -211,7 +211,7 @@ RemotePort::Answer LinuxRemotePort::awaitReply(std::uint32_t serial, Deadline de
         }
         if (!_socket)
             return {PortStatus::BecameInvalid, std::nullopt};
-        // A peer that keeps sending other things must not stretch the time.
+        // A peer that keeps sending other frames must not extend the time-out.
         if (late || !waitFor(_socket.get(), POLLIN, deadline))
             return {PortStatus::ReceiveTimeout, std::nullopt};
         late = SteadyClock::now() >= deadline;
@@ -243,7 +243,7 @@ std::optional<Frame> LinuxRemotePort::takeReply(std::uint32_t serial) {
     }
 }
 
-void LinuxRemotePort::takeWhatArrived() {
+void LinuxRemotePort::readAvailable() {
     if (_reader.readFrom(_socket.get()).outcome == FrameReader::Outcome::Ended)
         return connectionEnded();
     // Outside of sendRequest no reply is expected: all are discarded, since 0 is no request's serial.
@@ -289,7 +289,7 @@ void LinuxRemotePort::reportDropped() {
         return;
     logFormat(LogPriority::Error, "Message port %s: messages dropped because the peer is slow: %" PRIu64,
               _name.c_str(), std::exchange(_unreported, 0));
-    // What is dropped meanwhile is told when a second has passed.
+    // What is dropped meanwhile is reported after a second.
     _droppedReport.startOnce(std::chrono::seconds(1));
 }
 

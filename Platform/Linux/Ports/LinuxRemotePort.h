@@ -34,8 +34,8 @@ public:
     [[nodiscard]] bool isValid() const override;
     void setInvalidationCallback(std::function<void(RemotePort&)> callback) override;
     void invalidate() override;
-    /// As RemotePort says; what `post` has queued goes out first, within `sendTimeout`. A connection that
-    /// ends while the message is being sent gives BecameInvalid too.
+    /// As RemotePort says; what `post` has queued goes out first, within `sendTimeout`. The answer is
+    /// BecameInvalid also for a connection that ends while the message is being sent.
     Answer sendRequest(std::int32_t messageId, const Data& payload, std::chrono::nanoseconds sendTimeout,
                        std::chrono::nanoseconds receiveTimeout, bool wantsReply) override;
     void post(std::int32_t messageId, const Data& payload) override;
@@ -52,7 +52,7 @@ private:
     /// The reply with that serial out of what has arrived; others are late and are discarded. A malformed
     /// frame ends the connection.
     [[nodiscard]] std::optional<Frame> takeReply(std::uint32_t serial);
-    void takeWhatArrived();
+    void readAvailable();
     void flushQueue();
     void countDropped(std::uint64_t count);
     void reportDropped();
@@ -66,10 +66,10 @@ private:
     FileDescriptor _socket;
     FrameReader _reader;
     FrameQueue _queue;
-    bool _blocked = false; ///< the socket took no more when last tried
+    bool _blocked = false; ///< the last write would have blocked
     std::uint32_t _lastSerial = 0;
     std::uint64_t _dropped = 0;
-    std::uint64_t _unreported = 0; ///< dropped messages that no line has told of yet
+    std::uint64_t _unreported = 0; ///< dropped messages that are not logged yet
     LogLimiter _tooLong{std::chrono::seconds(1)};
     std::unique_ptr<SocketWatch> _readWatch;
     std::unique_ptr<SocketWatch> _writeWatch;

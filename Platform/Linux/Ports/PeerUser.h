@@ -9,8 +9,8 @@
 
 namespace velmora {
 
-/// Whether the process at the other end of a connected Unix-domain socket belongs to `wanted`; the failure
-/// names the user that it belongs to.
+/// Whether the peer of a connected Unix-domain socket runs as the user `wanted`; the failure names the peer's
+/// user.
 Result<Done> checkPeerUser(int descriptor, uid_t wanted);
 
 } // namespace velmora

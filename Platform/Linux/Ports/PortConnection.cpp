@@ -23,11 +23,11 @@ FrameReader::Read PortConnection::read() {
 }
 
 void PortConnection::send(const Frame& frame) {
-    _replies.pushRegardless(frame); // the port makes no reply for a clogged connection
+    _replies.pushUnbounded(frame); // the port makes no reply for a clogged connection
     flush();
 }
 
-bool PortConnection::isClogged() const {
+bool PortConnection::hasReplyBacklog() const {
     return !_broken && (_replies.size() >= maximumWaitingReplies || _replies.bytes() >= maximumWaitingBytes);
 }
 
@@ -38,7 +38,7 @@ void PortConnection::becomeReady() {
 }
 
 void PortConnection::flush() {
-    const bool wasClogged = isClogged();
+    const bool wasClogged = hasReplyBacklog();
     const auto flushed = _replies.flush(_socket.get());
     _broken = flushed == FrameQueue::Flushed::Broken;
     const bool waiting = !_broken && flushed != FrameQueue::Flushed::All;
@@ -47,7 +47,7 @@ void PortConnection::flush() {
             std::make_unique<SocketWatch>(_socket.get(), SocketWatch::For::Writing, [this] { flush(); });
     else if (_writeWatch)
         _writeWatch->setEnabled(waiting);
-    if (_broken || (wasClogged && !isClogged()))
+    if (_broken || (wasClogged && !hasReplyBacklog()))
         becomeReady();
 }
 

@@ -21,24 +21,24 @@ class PortConnection {
 public:
     explicit PortConnection(FileDescriptor socket);
 
-    /// `ready` runs when there may be something to do: bytes to read, room for replies again, or the end of
-    /// the connection (which reading then shows). To be set before the event loop runs again.
+    /// `ready` runs when there may be bytes to read, space for replies, or the end of the connection (which
+    /// reading then returns). To be set before the event loop runs again.
     void setReady(std::function<void()> ready) { _ready = std::move(ready); }
 
-    /// The next frame that has arrived whole, as FrameReader gives it.
+    /// The next complete frame, see FrameReader.
     [[nodiscard]] Result<std::optional<Frame>> next() { return _reader.next(); }
     /// Reads once; see FrameReader.
     [[nodiscard]] FrameReader::Read read();
     /// Lets `ready` run, or not, when bytes arrive. It may when the connection is made.
     void watchReading(bool enabled) { _readWatch->setEnabled(enabled); }
 
-    /// Sends the frame when the peer takes it. Never blocks.
+    /// Sends the frame when the socket is writable. Never blocks.
     void send(const Frame& frame);
     /// Whether so many replies wait for a peer that does not take them that no more may be made: its requests
     /// are not read until it does, so that it cannot fill this process's memory.
-    [[nodiscard]] bool isClogged() const;
+    [[nodiscard]] bool hasReplyBacklog() const;
 
-    /// Set by the port while the connection stands in its list of connections to serve.
+    /// Set by the port while the connection is in its list of connections to serve.
     bool queued = false;
 
 private:

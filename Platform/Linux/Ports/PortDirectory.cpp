@@ -42,7 +42,7 @@ Result<PortDirectory> PortDirectory::open(const std::filesystem::path& path, mod
         std::filesystem::create_directories(path.parent_path(), ignored);
     if (::mkdir(path.c_str(), S_IRWXU) != 0 && errno != EEXIST)
         return Failure{name + " cannot be made: " + errnoText(errno)};
-    // A symbolic link in a place that everybody can write to could be anybody's.
+    // A symbolic link in a world-writable directory could be any user's.
     FileDescriptor descriptor(::open(path.c_str(), O_RDONLY | O_DIRECTORY | O_CLOEXEC | O_NOFOLLOW));
     struct stat status = {};
     if (!descriptor || ::fstat(descriptor.get(), &status) != 0)

@@ -15,7 +15,7 @@
 
 namespace velmora {
 
-/// A socket's address as the system calls want it.
+/// A socket's address for the system calls.
 struct PortAddress {
     sockaddr_un address = {};
     socklen_t size = 0;
@@ -25,12 +25,12 @@ struct PortAddress {
 /// no other user can write to it.
 class PortDirectory {
 public:
-    /// Opens `path`, making it (mode 0700) and what is missing above it. A directory of another user, or one
-    /// that gives others one of the permissions `forbidden`, is refused.
+    /// Opens `path`, creating it (mode 0700) and its missing parents. A directory of another user, or one
+    /// that grants others one of the permissions `forbidden`, is refused.
     static Result<PortDirectory> open(const std::filesystem::path& path, mode_t forbidden);
 
-    /// Opens the place that the environment names: $VELMORA_PORT_DIR, $XDG_RUNTIME_DIR/velmora, or else
-    /// /tmp/velmora-UID. In the two standard places others may have no permission at all.
+    /// Opens the directory that the environment names: $VELMORA_PORT_DIR, $XDG_RUNTIME_DIR/velmora, or else
+    /// /tmp/velmora-UID. In the two default directories others may have no permission at all.
     static Result<PortDirectory> openStandard();
 
     [[nodiscard]] const std::filesystem::path& path() const { return _path; }

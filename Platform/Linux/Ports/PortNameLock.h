@@ -11,13 +11,13 @@
 
 namespace velmora {
 
-/// A port name that this process has taken. The lock is the kernel's, on a file beside the socket: it ends
-/// with the process however that ends, and whoever gets it afterwards owns the name and what lies under it.
-/// Move-only; destroying it frees the name and removes the file.
+/// A port name that this process has taken. The lock is the kernel's, on a file beside the socket: it is
+/// released when the process ends in any way, and its next holder owns the name and the socket. Move-only;
+/// destroying it frees the name and removes the file.
 class PortNameLock {
 public:
-    /// Takes the name; absent when its owner lives. Precondition: `directory`'s descriptor stays open for as
-    /// long as the lock is held.
+    /// Takes the name; absent when it has a live owner. Precondition: `directory`'s descriptor stays open for
+    /// as long as the lock is held.
     static Result<std::optional<PortNameLock>> take(const PortDirectory& directory, const std::string& name);
 
     PortNameLock(PortNameLock&& other) noexcept = default;

@@ -18,25 +18,24 @@ namespace velmora {
 
 /// How the ports of a LinuxMessagePorts behave.
 struct PortOptions {
-    /// Where the sockets lie; absent stands for the place that the environment names.
+    /// The directory of the sockets; absent for the one that the environment names.
     std::optional<std::filesystem::path> directory;
-    /// The user that peers have to belong to, on either side of a connection.
+    /// The user that peers must run as, on either side of a connection.
     uid_t peerUser = ::geteuid();
-    /// How much `RemotePort::post` lets wait.
+    /// The limits of `RemotePort::post`'s queue.
     FrameQueue::Limits queue;
-    /// Connections that a local port holds at the same time; newer ones are refused.
+    /// Maximum simultaneous connections of a local port; further ones are refused.
     std::size_t maximumConnections = 64;
     /// How long connecting may block when the peer's queue of new connections is full.
     std::chrono::nanoseconds connectTimeout = std::chrono::seconds(1);
-    /// How long connecting may block when the port's owner has crashed, in case that is just being started
-    /// again.
-    std::chrono::nanoseconds restartPatience{0};
+    /// How long connecting may block when the port's owner has crashed, in case it is being restarted.
+    std::chrono::nanoseconds restartTimeout{0};
 
-    /// For clients of a service. The next attempt is theirs to make seconds later, which a service that is
-    /// back within a moment is worth blocking for.
+    /// For clients of a service, which retry only seconds later: blocking briefly catches a service that
+    /// restarts at once.
     [[nodiscard]] static PortOptions forClients() {
         PortOptions options;
-        options.restartPatience = std::chrono::milliseconds(500);
+        options.restartTimeout = std::chrono::milliseconds(500);
         return options;
     }
 

@@ -7,9 +7,9 @@
 
 namespace velmora {
 
-/// Watches a file descriptor on the event loop and runs the action on every turn on which it is ready. The
-/// watch does not own the descriptor and has to be destroyed before it is closed; the owner may do so from
-/// the action. Main thread only.
+/// Watches a file descriptor on the event loop and runs the action in every iteration in which it is ready.
+/// The watch does not own the descriptor and has to be destroyed before it is closed; the owner may do so
+/// from the action. Main thread only.
 class SocketWatch {
 public:
     enum class For { Reading, Writing };

@@ -32,15 +32,15 @@ struct C2KPilot {
 
 /// The base stations of RadioNetwork with CDMA2000 sectors in the place of the UMTS cells, and the same car.
 /// The first network is system 32001 with the networks 11 and 12, in the PCS band; the second is system 32002
-/// with network 21, in the cellular band, where the phone roams. Depends on nothing but the seed and the
-/// steps driven.
+/// with network 21, in the cellular band, where the phone roams. Depends only on the seed and the steps
+/// driven.
 class C2KNetwork {
 public:
     explicit C2KNetwork(std::uint64_t seed) : _network(seed) { measure(); }
 
     static constexpr int homeSID = 32001;
 
-    /// Drives on for that long.
+    /// Drives on for that many seconds.
     void drive(double seconds);
 
     /// What the phone's receiver would measure now, the strongest first.

@@ -166,7 +166,7 @@ Report systemReport(Context& context) {
     return systemIdentification(phone.serving->sector, home ? 0 : 2);
 }
 
-DamageMaterial c2kDamageMaterial(Context& context, std::size_t turn) {
+UnusualMessageParts c2kUnusualMessageParts(Context& context, std::size_t turn) {
     const auto shortened = [&]() -> RecordBuilder {
         switch (turn % 7) {
         case 0: return systemIdentification(std::nullopt, 0).cutTo(150);

@@ -4,8 +4,8 @@
 #pragma once
 
 #include "Telephony/Drives/C2K/C2KRecords.h"
-#include "Telephony/Drives/DamagedRecords.h"
 #include "Telephony/Drives/PeriodicReport.h"
+#include "Telephony/Drives/UnusualMessages.h"
 
 #include <cstdint>
 #include <optional>
@@ -27,7 +27,7 @@ struct C2KPhone {
     [[nodiscard]] bool onPacketData() const { return evdo == records::EVDOState::Connected; }
 };
 
-/// What a report is made from. The counters keep what a modem counts from report to report.
+/// The input of a report. The counters continue from report to report, as a modem's do.
 struct C2KReportContext {
     const C2KPhone& phone;
     const C2KNetwork& network;
@@ -49,12 +49,12 @@ using C2KReport = PeriodicReport<C2KReportContext>;
 /// The reports of the phone's state: some ten messages a second, twenty in a call.
 [[nodiscard]] std::span<const C2KReport> c2kReports();
 
-/// The same records out of turn, for whoever changes what they show.
+/// The same records outside their period, for code that changes what they report.
 [[nodiscard]] std::optional<RecordBuilder> oneXStatusReport(C2KReportContext& context);
 [[nodiscard]] std::optional<RecordBuilder> evdoStatusReport(C2KReportContext& context);
 [[nodiscard]] std::optional<RecordBuilder> systemReport(C2KReportContext& context);
 
-/// What is given to be spoilt; `turn` picks which record is too short and which is inconsistent.
-[[nodiscard]] DamageMaterial c2kDamageMaterial(C2KReportContext& context, std::size_t turn);
+/// The parts of unusual messages; `turn` selects which record is too short and which is inconsistent.
+[[nodiscard]] UnusualMessageParts c2kUnusualMessageParts(C2KReportContext& context, std::size_t turn);
 
 } // namespace velmora

@@ -37,87 +37,87 @@ std::string_view C2KScenario::technology() const {
 }
 
 void C2KScenario::powerOn() {
-    say1x(0.5, OneXState::PowerUp);
-    say1x(1.2, OneXState::Initial);
-    say(2.0, [this] {
+    add1xStep(0.5, OneXState::PowerUp);
+    add1xStep(1.2, OneXState::Initial);
+    addStep(2.0, [this] {
         _phone.oneX = OneXState::Acquisition;
         return systemReport(_context);
     });
-    say1x(3.5, OneXState::Sync);
-    say(4.6, [this] {
+    add1xStep(3.5, OneXState::Sync);
+    addStep(4.6, [this] {
         if (!_network.pilots().empty())
             _phone.serving = _network.pilots().front();
         _phone.oneX = OneXState::Paging;
         return systemReport(_context);
     });
-    sayEVDO(6, EVDOState::Acquisition);
-    sayEVDO(7.5, EVDOState::Sync);
-    sayEVDO(8.4, EVDOState::Idle);
-    saySession(9, EVDOSession::AMPSetup);
-    say(10.2, [this] {
+    addEVDOStep(6, EVDOState::Acquisition);
+    addEVDOStep(7.5, EVDOState::Sync);
+    addEVDOStep(8.4, EVDOState::Idle);
+    addSessionStep(9, EVDOSession::AMPSetup);
+    addStep(10.2, [this] {
         _phone.session = EVDOSession::ATInitiated;
         _phone.uati = random().between(0, 0xFFFFFF);
         return evdoStatusReport(_context);
     });
-    saySession(11.5, EVDOSession::Initiated);
-    saySession(13, EVDOSession::Open);
+    addSessionStep(11.5, EVDOSession::Initiated);
+    addSessionStep(13, EVDOSession::Open);
 }
 
 void C2KScenario::connect() {
-    sayEVDO(0.3, EVDOState::Access);
-    sayEVDO(1.5, EVDOState::Connected);
+    addEVDOStep(0.3, EVDOState::Access);
+    addEVDOStep(1.5, EVDOState::Connected);
 }
 
 void C2KScenario::disconnect() {
-    sayEVDO(0.3, EVDOState::Idle);
+    addEVDOStep(0.3, EVDOState::Idle);
 }
 
 void C2KScenario::startCall() {
-    sayEVDO(0.2, EVDOState::Inactive);
-    say1x(0.4, OneXState::Paging);
-    say1x(2.5, OneXState::Traffic);
+    addEVDOStep(0.2, EVDOState::Inactive);
+    add1xStep(0.4, OneXState::Paging);
+    add1xStep(2.5, OneXState::Traffic);
 }
 
 void C2KScenario::endCall() {
-    say1x(0.3, OneXState::Paging);
-    sayEVDOReturn(3);
+    add1xStep(0.3, OneXState::Paging);
+    addEVDOReturn(3);
 }
 
 void C2KScenario::powerOff() {
-    saySession(0.3, EVDOSession::Closed);
-    sayEVDO(0.5, EVDOState::Inactive);
-    say(0.9, [this] {
+    addSessionStep(0.3, EVDOSession::Closed);
+    addEVDOStep(0.5, EVDOState::Inactive);
+    addStep(0.9, [this] {
         _phone.oneX = OneXState::Inactive;
         _phone.serving.reset();
         return oneXStatusReport(_context);
     });
 }
 
-void C2KScenario::say1x(double delay, OneXState state) {
-    say(delay, [this, state] {
+void C2KScenario::add1xStep(double delay, OneXState state) {
+    addStep(delay, [this, state] {
         _phone.oneX = state;
         return oneXStatusReport(_context);
     });
 }
 
-void C2KScenario::sayEVDO(double delay, EVDOState state) {
-    say(delay, [this, state] {
+void C2KScenario::addEVDOStep(double delay, EVDOState state) {
+    addStep(delay, [this, state] {
         _phone.evdo = state;
         return evdoStatusReport(_context);
     });
 }
 
-void C2KScenario::saySession(double delay, EVDOSession session) {
-    say(delay, [this, session] {
+void C2KScenario::addSessionStep(double delay, EVDOSession session) {
+    addStep(delay, [this, session] {
         _phone.session = session;
         return evdoStatusReport(_context);
     });
 }
 
-void C2KScenario::sayEVDOReturn(double delay) {
-    sayEVDO(delay, EVDOState::Acquisition);
-    sayEVDO(delay + 1.5, EVDOState::Sync);
-    sayEVDO(delay + 2.5, EVDOState::Idle);
+void C2KScenario::addEVDOReturn(double delay) {
+    addEVDOStep(delay, EVDOState::Acquisition);
+    addEVDOStep(delay + 1.5, EVDOState::Sync);
+    addEVDOStep(delay + 2.5, EVDOState::Idle);
 }
 
 void C2KScenario::drive(double seconds) {
@@ -140,7 +140,7 @@ void C2KScenario::react() {
         _network.pilots().front().level_dBm >= _phone.serving->level_dBm + reselectionMargin_dB;
     if (timeToReselect(better, reselectionTime_s)) {
         _phone.serving = _network.pilots().front();
-        say(0.1, [this] { return systemReport(_context); });
+        addStep(0.1, [this] { return systemReport(_context); });
     }
 }
 
@@ -148,8 +148,8 @@ void C2KScenario::addReports(DriveScript& due) {
     schedule(c2kReports(), _context, 0.037, due);
 }
 
-DamageMaterial C2KScenario::damageMaterial(std::size_t number) {
-    return c2kDamageMaterial(_context, number / everyDamage.size());
+UnusualMessageParts C2KScenario::unusualMessageParts(std::size_t number) {
+    return c2kUnusualMessageParts(_context, number / allUnusualMessages.size());
 }
 
 } // namespace velmora

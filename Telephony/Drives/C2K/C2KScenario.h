@@ -25,9 +25,9 @@ namespace velmora {
 ///   EV-DO is Inactive meanwhile, as the one transmitter is the call's, and comes back after it.
 /// - A second EV-DO connection, then power-off, and again from the start, at another place of the ring.
 ///
-/// About ten messages come a second, twenty in a call. Every ten seconds or so a message is odd (see Damage):
-/// records of all kinds that come too short, a system identification that lacks the base station, counts that
-/// are too high, sub-packets that are missing or too large. There is no extra stream.
+/// About ten messages come a second, twenty in a call. About every ten seconds a message is unusual (see
+/// UnusualMessage): records of all kinds that come too short, a system identification that lacks the base
+/// station, counts that are too high, sub-packets that are missing or too large. There is no extra stream.
 /// Main thread only.
 class C2KScenario final : public DriveScenario {
 public:
@@ -37,7 +37,7 @@ public:
 private:
     static const Phase phases[];
 
-    /// What the phone goes through; each puts its steps on the script, from now on.
+    /// The phone's procedures; each adds its steps to the script, from now on.
     void powerOn();
     void connect();
     void disconnect();
@@ -49,13 +49,13 @@ private:
     void react() override;
     void addReports(DriveScript& due) override;
     void countUntil(double at) override { _context.transferUntil(at); }
-    [[nodiscard]] DamageMaterial damageMaterial(std::size_t number) override;
+    [[nodiscard]] UnusualMessageParts unusualMessageParts(std::size_t number) override;
 
-    void say1x(double delay, records::OneXState state);
-    void sayEVDO(double delay, records::EVDOState state);
-    void saySession(double delay, records::EVDOSession session);
+    void add1xStep(double delay, records::OneXState state);
+    void addEVDOStep(double delay, records::EVDOState state);
+    void addSessionStep(double delay, records::EVDOSession session);
     /// Acquires the EV-DO carrier again, with the session that there is.
-    void sayEVDOReturn(double delay);
+    void addEVDOReturn(double delay);
 
     C2KNetwork _network;
     C2KPhone _phone;

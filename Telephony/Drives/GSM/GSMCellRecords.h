@@ -29,12 +29,12 @@ enum class RRState : std::uint8_t {
     GSMToUMTSHandover = 19,
 };
 
-/// What a neighbour's path-loss criterion is counted from: the least level at which a cell may be used.
+/// The reference of a neighbour's path-loss criterion: the lowest level at which a cell may be used.
 inline constexpr int gsmAccessMinimum_dBm = -105;
 
 /// 0x5134
 [[nodiscard]] RecordBuilder gsmServingCell(const GSMCell& cell);
-/// 0x5137. Levels stand there as magnitudes: 85 is -85 dBm. At most 32 neighbours.
+/// 0x5137. Levels are magnitudes: 85 is -85 dBm. At most 32 neighbours.
 [[nodiscard]] RecordBuilder gsmMeasurements(const GSMMeasurement& serving, int c2, bool hysteresisApplied,
                                             const std::vector<GSMMeasurement>& neighbours);
 /// 0x5076

@@ -34,8 +34,8 @@ struct GSMPhone {
     records::RRCState rrc = records::RRCState::Disconnected;
 
     bool registered = false;
-    CellArea registeredArea{{1, 1}, 4101, 1}; ///< where the network last knew it
-    Radio registeredRadio = Radio::Off;       ///< on which radio that was
+    CellArea registeredArea{{1, 1}, 4101, 1}; ///< its last registration
+    Radio registeredRadio = Radio::Off;       ///< the radio of that registration
     int contexts = 0;                         ///< active packet-data contexts
 
     /// The area of the cell that it camps on; that of its last registration where it camps on none.

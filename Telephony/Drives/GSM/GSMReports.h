@@ -12,12 +12,12 @@
 
 namespace velmora {
 
-/// What a report is made from. The counters keep what a modem counts from report to report.
+/// The input of a report. The counters continue from report to report, as a modem's do.
 struct GSMReportContext {
     const GSMPhone& phone;
     const RadioNetwork& network;
     ScenarioRandom& random;
-    bool binary = false;        ///< the form of the next property list; reports turn it over
+    bool binary = false;        ///< the form of the next property list; reports toggle it
     std::int64_t crcs = 0;      ///< transport blocks so far
     std::int64_t crcErrors = 0; ///< those that came wrong
     int subFrames = 0;          ///< HSDPA sub-frames so far, modulo 1024
@@ -28,7 +28,7 @@ using GSMReport = PeriodicReport<GSMReportContext>;
 /// The reports of the phone's state: some twenty messages a second.
 [[nodiscard]] std::span<const GSMReport> reportsOf(const GSMPhone& phone);
 
-/// The same records out of turn, for whoever wants one to spoil.
+/// The same records outside their period, as parts of unusual messages.
 [[nodiscard]] std::optional<RecordBuilder> gsmMeasurementReport(GSMReportContext& context);
 [[nodiscard]] std::optional<RecordBuilder> registrationReport(GSMReportContext& context);
 

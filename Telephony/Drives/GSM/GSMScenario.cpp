@@ -43,9 +43,9 @@ std::string_view GSMScenario::technology() const {
 void GSMScenario::drive(double seconds) {
     _network.drive(seconds);
     if (_phone.gsm.cell)
-        _phone.gsm = measuredAnew(_phone.gsm, _network.gsm());
+        _phone.gsm = updatedMeasurement(_phone.gsm, _network.gsm());
     if (_phone.umts.cell)
-        _phone.umts = measuredAnew(_phone.umts, _network.umts());
+        _phone.umts = updatedMeasurement(_phone.umts, _network.umts());
 }
 
 void GSMScenario::react() {
@@ -72,15 +72,15 @@ void GSMScenario::addReports(DriveScript& due) {
     schedule(reportsOf(_phone), _context, 0.137, due);
 }
 
-DamageMaterial GSMScenario::damageMaterial(std::size_t number) {
-    DamageMaterial material{
+UnusualMessageParts GSMScenario::unusualMessageParts(std::size_t number) {
+    UnusualMessageParts material{
         *registrationReport(_context),
         records::servingNetwork(0, records::ServiceType::CSAndPS, _phone.area()).cutTo(31),
         gsmMeasurementReport(_context)};
     // The count of a measurement record says two more than there are.
     if (material.overrun)
         material.overrun->u8(28, static_cast<std::int64_t>((material.overrun->size() - 29) / 14) + 2);
-    if (everyDamage[number % everyDamage.size()] == Damage::UnknownCode)
+    if (allUnusualMessages[number % allUnusualMessages.size()] == UnusualMessage::UnknownCode)
         material.noise = random().between(0, 1 << 20);
     return material;
 }

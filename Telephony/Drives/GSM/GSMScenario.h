@@ -28,9 +28,9 @@ namespace velmora {
 /// - Reselection to GSM, to UMTS and back, each with its area update; then detach, power-off, and again from
 ///   the start, at another place of the ring.
 ///
-/// About twenty messages come a second. The extra stream reports the SIM, the cells around and the
-/// contexts, as binary and XML property lists in turn. Every ten seconds or so a message is odd (see Damage).
-/// Main thread only.
+/// About twenty messages come a second. The extra stream reports the SIM, the cells around and the contexts,
+/// as binary and XML property lists in turn. About every ten seconds a message is unusual (see
+/// UnusualMessage). Main thread only.
 class GSMScenario final : public DriveScenario {
 public:
     explicit GSMScenario(std::uint64_t seed);
@@ -48,7 +48,7 @@ private:
     void drive(double seconds) override;
     void react() override;
     void addReports(DriveScript& due) override;
-    [[nodiscard]] DamageMaterial damageMaterial(std::size_t number) override;
+    [[nodiscard]] UnusualMessageParts unusualMessageParts(std::size_t number) override;
 
     RadioNetwork _network;
     GSMPhone _phone;

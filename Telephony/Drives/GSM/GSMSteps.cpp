@@ -17,15 +17,15 @@ constexpr int networkOperatingMode = 0; ///< class 1: paging is coordinated
 
 } // namespace
 
-void GSMSteps::sayRegistration(double at, RegistrationState state) {
-    say(at, [this, state] {
+void GSMSteps::addRegistrationStep(double at, RegistrationState state) {
+    addStep(at, [this, state] {
         _phone.registration = state;
         return registrationState(state);
     });
 }
 
-void GSMSteps::sayMM(double at, MMState state, MMSubState subState) {
-    say(at, [this, state, subState] {
+void GSMSteps::addMMStep(double at, MMState state, MMSubState subState) {
+    addStep(at, [this, state, subState] {
         _phone.mm = state;
         _phone.mmSub = subState;
         _phone.mmStatus =
@@ -34,8 +34,8 @@ void GSMSteps::sayMM(double at, MMState state, MMSubState subState) {
     });
 }
 
-void GSMSteps::sayGMM(double at, GMMState state, GMMSubState subState) {
-    say(at, [this, state, subState] {
+void GSMSteps::addGMMStep(double at, GMMState state, GMMSubState subState) {
+    addStep(at, [this, state, subState] {
         _phone.gmm = state;
         _phone.gmmSub = subState;
         _phone.gmmStatus =
@@ -44,22 +44,22 @@ void GSMSteps::sayGMM(double at, GMMState state, GMMSubState subState) {
     });
 }
 
-void GSMSteps::sayRR(double at, RRState state) {
-    say(at, [this, state] {
+void GSMSteps::addRRStep(double at, RRState state) {
+    addStep(at, [this, state] {
         _phone.rr = state;
         return rrState(state, 0, 1, _phone.connection == GSMPhone::Connection::PacketSession);
     });
 }
 
-void GSMSteps::sayRRC(double at, RRCState state) {
-    say(at, [this, state] {
+void GSMSteps::addRRCStep(double at, RRCState state) {
+    addStep(at, [this, state] {
         _phone.rrc = state;
         return rrcState(state);
     });
 }
 
-void GSMSteps::sayContexts(double at, int count) {
-    say(at, [this, count] {
+void GSMSteps::addContextsStep(double at, int count) {
+    addStep(at, [this, count] {
         _phone.contexts = count;
         std::vector<DictionaryRef> contexts;
         for (int number = 1; number <= count; ++number)
@@ -69,8 +69,8 @@ void GSMSteps::sayContexts(double at, int count) {
     });
 }
 
-void GSMSteps::sayDedicatedChannel(double at) {
-    say(at, [this]() -> std::optional<RecordBuilder> {
+void GSMSteps::addDedicatedChannelStep(double at) {
+    addStep(at, [this]() -> std::optional<RecordBuilder> {
         if (!_phone.gsm.cell)
             return std::nullopt;
         return dedicatedChannel(_phone.gsm.cell->arfcn);
@@ -79,37 +79,37 @@ void GSMSteps::sayDedicatedChannel(double at) {
 
 void GSMSteps::connect(double at) {
     if (_phone.radio == GSMPhone::Radio::UMTS) {
-        sayRRC(at, RRCState::Connecting);
-        sayRRC(at + 0.4, RRCState::CellFACH);
-        sayRRC(at + 0.7, RRCState::CellDCH);
-        say(at + 0.9, [] { return ciphering(true); });
+        addRRCStep(at, RRCState::Connecting);
+        addRRCStep(at + 0.4, RRCState::CellFACH);
+        addRRCStep(at + 0.7, RRCState::CellDCH);
+        addStep(at + 0.9, [] { return ciphering(true); });
     } else {
-        sayRR(at, RRState::ConnectionPending);
-        sayDedicatedChannel(at + 0.3);
-        sayRR(at + 0.4, RRState::GoingActive);
-        sayRR(at + 0.7, RRState::DataTransfer);
+        addRRStep(at, RRState::ConnectionPending);
+        addDedicatedChannelStep(at + 0.3);
+        addRRStep(at + 0.4, RRState::GoingActive);
+        addRRStep(at + 0.7, RRState::DataTransfer);
     }
 }
 
 void GSMSteps::release(double at) {
     if (_phone.radio == GSMPhone::Radio::UMTS) {
-        say(at, [] { return ciphering(false); });
-        sayRRC(at + 0.2, RRCState::Disconnected);
+        addStep(at, [] { return ciphering(false); });
+        addRRCStep(at + 0.2, RRCState::Disconnected);
     } else {
-        sayRR(at, RRState::ConnectionRelease);
-        sayRR(at + 0.3, RRState::Idle);
+        addRRStep(at, RRState::ConnectionRelease);
+        addRRStep(at + 0.3, RRState::Idle);
     }
 }
 
 void GSMSteps::accept(double at) {
-    say(at, [this] {
+    addStep(at, [this] {
         _phone.registered = true;
         _phone.registeredArea = _phone.area();
         _phone.registeredRadio = _phone.radio;
         return servingNetwork(networkOperatingMode, ServiceType::CSAndPS, _phone.registeredArea);
     });
     // A network names those that count as its own: alone for the smaller one.
-    say(at + 0.05, [this] {
+    addStep(at + 0.05, [this] {
         const bool home = _phone.registeredArea.plmn.mnc == 1;
         return equivalentNetworks(home ? std::vector<PLMN>{{1, 2}} : std::vector<PLMN>{{1, 1}, {111, 11}});
     });

@@ -22,20 +22,20 @@ public:
         : _phone(phone), _network(network), _script(script) {}
 
 protected:
-    void say(double at, DriveStep step) { _script.emplace(at, std::move(step)); }
-    void sayRegistration(double at, records::RegistrationState state);
-    void sayMM(double at, records::MMState state, records::MMSubState subState);
-    void sayGMM(double at, records::GMMState state, records::GMMSubState subState);
-    void sayRR(double at, records::RRState state);
-    void sayRRC(double at, records::RRCState state);
-    void sayContexts(double at, int count);
-    void sayDedicatedChannel(double at);
+    void addStep(double at, DriveStep step) { _script.emplace(at, std::move(step)); }
+    void addRegistrationStep(double at, records::RegistrationState state);
+    void addMMStep(double at, records::MMState state, records::MMSubState subState);
+    void addGMMStep(double at, records::GMMState state, records::GMMSubState subState);
+    void addRRStep(double at, records::RRState state);
+    void addRRCStep(double at, records::RRCState state);
+    void addContextsStep(double at, int count);
+    void addDedicatedChannelStep(double at);
     /// The signalling connection on whichever radio the phone is; takes a second.
     void connect(double at);
     void release(double at);
     /// The network's acceptance of a location update: identities and the equivalent networks.
     void accept(double at);
-    /// The phone moves to the best cell there; its record, none where there is no cell.
+    /// The phone camps on the best cell; returns its record, none where there is no cell.
     [[nodiscard]] std::optional<RecordBuilder> campOnGSM();
     [[nodiscard]] std::optional<RecordBuilder> campOnUMTS();
 

@@ -87,10 +87,10 @@ enum class ServiceType : std::uint8_t { NoService, CSOnly, PSOnly, CSAndPS, Limi
 [[nodiscard]] RecordBuilder registrationState(RegistrationState state);
 /// 0x7135; `operatingMode` counts from 0.
 [[nodiscard]] RecordBuilder servingNetwork(int operatingMode, ServiceType service, const CellArea& area);
-/// 0x7150. The digits of an entry stand alternately (MCC 1, MNC 1, MCC 2, MNC 2, MCC 3, MNC 3) in six bytes,
-/// but entries are read three bytes apart: all but the first share half of their bytes with the one before,
-/// whose second half is their first. So the first network stands as it is, and of each later one only the
-/// last half can be its own.
+/// 0x7150. The digits of an entry alternate (MCC 1, MNC 1, MCC 2, MNC 2, MCC 3, MNC 3) in six bytes, but
+/// entries are read three bytes apart: all but the first share half of their bytes with the one before, whose
+/// second half is their first. So the first network is stored unchanged, and of each later one only the last
+/// half.
 [[nodiscard]] RecordBuilder equivalentNetworks(const std::vector<PLMN>& networks);
 
 } // namespace velmora::records

@@ -14,7 +14,7 @@ std::size_t countUpTo(std::size_t limit, const std::vector<Entry>& entries) {
     return std::min(limit, entries.size());
 }
 
-void layProcess(RecordBuilder& record, std::size_t entry, const HARQProcess& process) {
+void writeProcess(RecordBuilder& record, std::size_t entry, const HARQProcess& process) {
     record.u8(entry, process.identity)
         .u32(entry + 1, process.receivedBits)
         .u16(entry + 5, process.newTransmissions)
@@ -127,10 +127,10 @@ RecordBuilder harqStatistics(int subFrames, const std::vector<HARQProcess>& prim
         .u8(16, static_cast<int>(primaries))
         .u8(17, static_cast<int>(secondaries));
     for (std::size_t i = 0; i < primaries; ++i)
-        layProcess(record, 18 + 9 * i, primary[i]);
+        writeProcess(record, 18 + 9 * i, primary[i]);
     // Each primary process takes a block of 162 bytes before the secondary ones begin.
     for (std::size_t i = 0; i < secondaries; ++i)
-        layProcess(record, 18 + 162 * primaries + 9 * i, secondary[i]);
+        writeProcess(record, 18 + 162 * primaries + 9 * i, secondary[i]);
     return record;
 }
 

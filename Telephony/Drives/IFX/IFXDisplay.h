@@ -23,9 +23,9 @@ struct IFXPhone {
     double loss = 0.5;   ///< what the radio link loses, 0 (nothing) to 1
 };
 
-/// The display that such a baseband sends: dictionaries, arrays and strings and nothing else, since any other
-/// kind of value would end the application. Several dictionaries have one entry, now and then or always; the
-/// decoder folds them.
+/// The display that such a baseband sends: only dictionaries, arrays and strings, since any other kind of
+/// value would end the application. Several dictionaries have one entry, at times or always; the decoder
+/// collapses them.
 [[nodiscard]] Value ifxDisplay(const IFXPhone& phone, const RadioNetwork& network);
 
 } // namespace velmora

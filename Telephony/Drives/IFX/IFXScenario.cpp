@@ -85,7 +85,7 @@ void IFXScenario::camp() {
     }
     const auto& cells = _network.gsm();
     if (_phone.serving)
-        _phone.serving = measuredAnew(*_phone.serving, cells);
+        _phone.serving = updatedMeasurement(*_phone.serving, cells);
     if (!cells.empty() &&
         (!_phone.serving || cells.front().rssi_dBm >= _phone.serving->rssi_dBm + reselectionMargin_dB))
         _phone.serving = cells.front();

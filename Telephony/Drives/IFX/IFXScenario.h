@@ -21,12 +21,12 @@ namespace velmora {
 /// - A packet session of one context, then one of two, with the coding scheme.
 /// - Again from the start, at another place of the ring.
 ///
-/// Dictionaries of one entry are among what it sends, some in every message, some only where there is no more
-/// to say, and a chain of them; they show as their single value. No message is ever odd, unlike those of the
-/// other scenarios: this technology's decoder ends the application where it cannot read one, or where one
-/// holds anything but dictionaries, arrays and strings.
+/// Some dictionaries have one entry, in every message or at times, and there is a chain of them; they are
+/// shown as their single value. No message is malformed, unlike those of the other scenarios: this
+/// technology's decoder ends the application where it cannot read one, or where one holds anything but
+/// dictionaries, arrays and strings.
 ///
-/// All comes of the seed: the same seed gives the same bytes. Main thread only.
+/// Everything depends only on the seed: the same seed gives the same bytes. Main thread only.
 class IFXScenario final : public Scenario {
 public:
     explicit IFXScenario(std::uint64_t seed);

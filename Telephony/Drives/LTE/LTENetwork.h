@@ -48,12 +48,12 @@ struct LTEMeasurement {
 };
 
 /// The base stations of RadioNetwork with LTE on all sectors and all carriers, and the same car, which passes
-/// the GSM and UMTS cells of that network, too. Depends on nothing but the seed and the steps driven.
+/// the GSM and UMTS cells of that network, too. Depends only on the seed and the steps driven.
 class LTENetwork {
 public:
     explicit LTENetwork(std::uint64_t seed) : _network(seed), _random(seed ^ 0x17E) { measure(); }
 
-    /// Drives on for that long.
+    /// Drives on for that many seconds.
     void drive(double seconds);
 
     /// What the phone's receiver would measure now on that carrier, the best first; only cells above its

@@ -157,14 +157,14 @@ Report neighbours(Context& context) {
         cells.push_back(cell);
     }
     if (cells.empty())
-        return std::nullopt; // the record cannot say that there are none
+        return std::nullopt; // the record cannot express an empty list
     return lteNeighbours(lteCarriers[carrier], cells);
 }
 
 Report candidates(Context& context) {
     if (!context.phone.serving)
         return std::nullopt;
-    // One candidate of each type in turn, then several at once.
+    // One candidate of each type, one after another, then several together.
     const std::size_t turn = context.candidates++ % (std::size(everyType) + 1);
     std::vector<ReselectionCandidate> list;
     if (turn < std::size(everyType)) {

@@ -24,7 +24,7 @@ struct LTEPhone {
     LTEMeasurement average;                ///< of the serving cell's last measurements
     int cyclesBelow = 0; ///< measurements since the serving cell was good enough, at most 63
     int contexts = 0;    ///< active packet-data contexts
-    CellArea registeredArea{{1, 1}, 7101, 1}; ///< where the network last knew it
+    CellArea registeredArea{{1, 1}, 7101, 1}; ///< its last registration
 };
 
 /// What a report is made from.
@@ -32,7 +32,7 @@ struct LTEReportContext {
     const LTEPhone& phone;
     const LTENetwork& network;
     ScenarioRandom& random;
-    bool binary = false;        ///< the form of the next property list; reports turn it over
+    bool binary = false;        ///< the form of the next property list; reports toggle it
     std::size_t neighbours = 0; ///< neighbour reports so far
     std::size_t candidates = 0; ///< candidate reports so far
     int subframe = 0;           ///< of 1024 frames of ten
@@ -43,7 +43,7 @@ using LTEReport = PeriodicReport<LTEReportContext>;
 /// The reports of the phone's state: some six to eight messages a second.
 [[nodiscard]] std::span<const LTEReport> reportsOf(const LTEPhone& phone);
 
-/// The same records out of turn.
+/// The same records outside their period.
 namespace lteReports {
 [[nodiscard]] std::optional<RecordBuilder> servingCell(LTEReportContext& context);
 [[nodiscard]] std::optional<RecordBuilder> antennas(LTEReportContext& context);

@@ -58,15 +58,15 @@ std::optional<RecordBuilder> LTEScenario::camp() {
     return lteReports::servingCell(_context);
 }
 
-void LTEScenario::sayConnected(double delay, bool connected) {
-    say(delay, [this, connected] {
+void LTEScenario::addConnectedStep(double delay, bool connected) {
+    addStep(delay, [this, connected] {
         _phone.connected = connected && _phone.serving;
         return lteReports::antennas(_context);
     });
 }
 
-void LTEScenario::sayContexts(double delay, int count) {
-    say(delay, [this, count] {
+void LTEScenario::addContextsStep(double delay, int count) {
+    addStep(delay, [this, count] {
         _phone.contexts = count;
         return lteReports::contexts(_context);
     });
@@ -77,45 +77,45 @@ void LTEScenario::powerOn() {
     _phone = LTEPhone{};
     _phone.registeredArea = lastArea;
     _phone.radio = LTEPhone::Radio::Searching;
-    sayContexts(0.2, 0);
-    say(0.5, [this] { return lteReports::sim(_context); });
-    say(4, [this] { return camp(); });
-    say(4.1, [this] { return lteReports::antennas(_context); });
+    addContextsStep(0.2, 0);
+    addStep(0.5, [this] { return lteReports::sim(_context); });
+    addStep(4, [this] { return camp(); });
+    addStep(4.1, [this] { return lteReports::antennas(_context); });
 }
 
 void LTEScenario::registerWithNetwork() {
-    sayConnected(0.2, true);
-    say(2.0, [this] {
+    addConnectedStep(0.2, true);
+    addStep(2.0, [this] {
         if (_phone.serving)
             _phone.registeredArea = _phone.serving->cell.area;
         return lteReports::sim(_context);
     });
-    sayContexts(2.2, 1); // LTE knows no registration without one
-    sayConnected(4, false);
+    addContextsStep(2.2, 1); // LTE knows no registration without one
+    addConnectedStep(4, false);
 }
 
 void LTEScenario::startSession() {
-    sayConnected(0.2, true);
-    sayContexts(1.0, random().chance(0.5) ? 2 : 1);
+    addConnectedStep(0.2, true);
+    addContextsStep(1.0, random().chance(0.5) ? 2 : 1);
 }
 
 void LTEScenario::endSession() {
-    sayContexts(0.1, 1);
-    sayConnected(1, false);
+    addContextsStep(0.1, 1);
+    addConnectedStep(1, false);
 }
 
 void LTEScenario::changeCarrier() {
     // The modem weighs the candidates before it goes.
-    say(1, [this] { return lteReports::candidates(_context); });
-    say(2, [this] {
+    addStep(1, [this] { return lteReports::candidates(_context); });
+    addStep(2, [this] {
         _phone.carrier = (_phone.carrier + 1) % lteCarriers.size();
         return camp();
     });
 }
 
 void LTEScenario::connectBriefly() {
-    sayConnected(0.2, true);
-    sayConnected(4, false);
+    addConnectedStep(0.2, true);
+    addConnectedStep(4, false);
 }
 
 void LTEScenario::updateArea() {
@@ -124,19 +124,19 @@ void LTEScenario::updateArea() {
         _phone.serving->cell.area == _phone.registeredArea)
         return;
     if (!_phone.connected) {
-        sayConnected(0.1, true);
-        sayConnected(2, false);
+        addConnectedStep(0.1, true);
+        addConnectedStep(2, false);
     }
-    say(1, [this] {
+    addStep(1, [this] {
         _phone.registeredArea = _phone.serving->cell.area;
         return lteReports::sim(_context);
     });
 }
 
 void LTEScenario::powerOff() {
-    sayConnected(0.1, true);
-    sayContexts(1, 0);
-    say(1.5, [this]() -> std::optional<RecordBuilder> {
+    addConnectedStep(0.1, true);
+    addContextsStep(1, 0);
+    addStep(1.5, [this]() -> std::optional<RecordBuilder> {
         _phone.connected = false;
         _phone.radio = LTEPhone::Radio::Off;
         _phone.serving.reset();
@@ -148,7 +148,7 @@ void LTEScenario::drive(double seconds) {
     _network.drive(seconds);
     if (!_phone.serving)
         return;
-    _phone.serving = measuredAnew(*_phone.serving, _network.cells(_phone.carrier));
+    _phone.serving = updatedMeasurement(*_phone.serving, _network.cells(_phone.carrier));
     _phone.average.rsrp_dBm += averaging * (_phone.serving->rsrp_dBm - _phone.average.rsrp_dBm);
     _phone.average.rsrq_dB += averaging * (_phone.serving->rsrq_dB - _phone.average.rsrq_dB);
     _phone.cyclesBelow =
@@ -160,7 +160,7 @@ void LTEScenario::react() {
     const bool better = _phone.serving && !cells.empty() &&
                         cells.front().rsrp_dBm >= _phone.serving->rsrp_dBm + reselectionMargin_dB;
     if (timeToReselect(better, reselectionTime_s))
-        say(0, [this] { return camp(); });
+        addStep(0, [this] { return camp(); });
     updateArea();
 }
 
@@ -168,9 +168,9 @@ void LTEScenario::addReports(DriveScript& due) {
     schedule(reportsOf(_phone), _context, 0.137, due);
 }
 
-DamageMaterial LTEScenario::damageMaterial(std::size_t number) {
+UnusualMessageParts LTEScenario::unusualMessageParts(std::size_t number) {
     // Which records are spoilt changes from round to round of the kinds of damage.
-    const std::size_t round = number / everyDamage.size();
+    const std::size_t round = number / allUnusualMessages.size();
     const LTEMeasurement serving = _phone.serving.value_or(LTEMeasurement{});
     RecordBuilder tooShort = records::lteServingCell(serving.cell);
     switch (round % 5) {

@@ -28,10 +28,10 @@ namespace velmora {
 /// and cell the priority and type of the one after it, since that is where the record has them.
 ///
 /// From six to eight messages come a second. The extra stream reports the SIM, the cells around and the
-/// contexts, as binary and XML property lists in turn. Every ten seconds or so a message is odd (see Damage):
-/// the records of serving cell, idle and connected measurement, neighbours and candidates come too short by
-/// turns, and each of the three counted ones with a count too high.
-/// Main thread only.
+/// contexts, as binary and XML property lists in turn. About every ten seconds a message is unusual (see
+/// UnusualMessage): the records of serving cell, idle and connected measurement, neighbours and candidates
+/// are too short in rotation, and each of the three counted ones has a count that is too high. Main thread
+/// only.
 class LTEScenario final : public DriveScenario {
 public:
     explicit LTEScenario(std::uint64_t seed);
@@ -40,7 +40,7 @@ public:
 private:
     static const Phase phases[];
 
-    /// What the phone goes through; each puts its steps on the script, from now on.
+    /// The phone's procedures; each adds its steps to the script, from now on.
     void powerOn();
     void registerWithNetwork();
     void startSession();
@@ -48,19 +48,19 @@ private:
     /// Reselects to the best cell of the next carrier.
     void changeCarrier();
     void connectBriefly();
-    /// Tells the network of the tracking area, where it knows another.
+    /// Sends a tracking area update if the network has another area.
     void updateArea();
     void powerOff();
 
     void drive(double seconds) override;
     void react() override;
     void addReports(DriveScript& due) override;
-    [[nodiscard]] DamageMaterial damageMaterial(std::size_t number) override;
+    [[nodiscard]] UnusualMessageParts unusualMessageParts(std::size_t number) override;
 
     /// Camps on the best cell of the phone's carrier, where there is one, and reports it.
     std::optional<RecordBuilder> camp();
-    void sayConnected(double delay, bool connected);
-    void sayContexts(double delay, int count);
+    void addConnectedStep(double delay, bool connected);
+    void addContextsStep(double delay, int count);
 
     LTENetwork _network;
     LTEPhone _phone;

@@ -26,12 +26,12 @@ struct UTRANMeasurement {
 
 /// The base stations of RadioNetwork with a TD-SCDMA cell in the place of each UMTS one, and the same car:
 /// nine carriers, so that every cell has a few neighbours on its own. No carrier has a cell parameter id
-/// twice. Depends on nothing but the seed and the steps driven.
+/// twice. Depends only on the seed and the steps driven.
 class UTRANNetwork {
 public:
     explicit UTRANNetwork(std::uint64_t seed) : _network(seed) { measure(); }
 
-    /// Drives on for that long.
+    /// Drives on for that many seconds.
     void drive(double seconds);
 
     /// What the phone's receiver would measure now, the best first; only cells above its sensitivity.

@@ -22,7 +22,7 @@ struct UTRANPhone {
     bool registered = false;
     bool call = false;                        ///< of speech
     int contexts = 0;                         ///< active packet-data contexts
-    CellArea registeredArea{{1, 1}, 4101, 1}; ///< where the network last knew it
+    CellArea registeredArea{{1, 1}, 4101, 1}; ///< its last registration
 
     /// Whether it has channels whose quality can be measured.
     [[nodiscard]] bool hasChannels() const {
@@ -35,7 +35,7 @@ struct UTRANReportContext {
     const UTRANPhone& phone;
     const UTRANNetwork& network;
     ScenarioRandom& random;
-    bool binary = false; ///< the form of the next property list; reports turn it over
+    bool binary = false; ///< the form of the next property list; reports toggle it
 };
 
 using UTRANReport = PeriodicReport<UTRANReportContext>;
@@ -43,7 +43,7 @@ using UTRANReport = PeriodicReport<UTRANReportContext>;
 /// The reports of the phone's state: some ten messages a second.
 [[nodiscard]] std::span<const UTRANReport> reportsOf(const UTRANPhone& phone);
 
-/// The same records out of turn.
+/// The same records outside their period.
 namespace utranReports {
 [[nodiscard]] std::optional<RecordBuilder> rrc(UTRANReportContext& context);
 [[nodiscard]] std::optional<RecordBuilder> serving(UTRANReportContext& context);

@@ -41,15 +41,15 @@ std::string_view UTRANScenario::technology() const {
     return kVoxLogChannelTechnology_Ostrel_UTRAN2;
 }
 
-void UTRANScenario::sayRRC(double delay, RRCState state) {
-    say(delay, [this, state] {
+void UTRANScenario::addRRCStep(double delay, RRCState state) {
+    addStep(delay, [this, state] {
         _phone.rrc = state;
         return utranReports::rrc(_context);
     });
 }
 
-void UTRANScenario::sayContexts(double delay, int count) {
-    say(delay, [this, count] {
+void UTRANScenario::addContextsStep(double delay, int count) {
+    addStep(delay, [this, count] {
         _phone.contexts = count;
         return utranReports::contexts(_context);
     });
@@ -60,9 +60,9 @@ void UTRANScenario::powerOn() {
     _phone = UTRANPhone{};
     _phone.registeredArea = lastArea;
     _phone.radio = UTRANPhone::Radio::Searching;
-    sayRRC(0.1, RRCState::Disconnected);
-    sayContexts(0.2, 0);
-    say(5, [this] {
+    addRRCStep(0.1, RRCState::Disconnected);
+    addContextsStep(0.2, 0);
+    addStep(5, [this] {
         if (!_network.cells().empty()) {
             _phone.radio = UTRANPhone::Radio::Camped;
             _phone.serving = _network.cells().front();
@@ -72,39 +72,39 @@ void UTRANScenario::powerOn() {
 }
 
 void UTRANScenario::registerWithNetwork() {
-    sayRRC(0.2, RRCState::Connecting);
-    sayRRC(0.6, RRCState::CellDCH);
-    say(2.5, [this] {
+    addRRCStep(0.2, RRCState::Connecting);
+    addRRCStep(0.6, RRCState::CellDCH);
+    addStep(2.5, [this] {
         _phone.registered = _phone.serving.has_value();
         if (_phone.serving)
             _phone.registeredArea = _phone.serving->cell.area;
         return utranReports::serving(_context);
     });
-    say(2.7, [this] { return utranReports::sim(_context); });
-    sayRRC(3.5, RRCState::Disconnected);
-    say(3.6, [this] { return utranReports::quality(_context); });
+    addStep(2.7, [this] { return utranReports::sim(_context); });
+    addRRCStep(3.5, RRCState::Disconnected);
+    addStep(3.6, [this] { return utranReports::quality(_context); });
 }
 
 void UTRANScenario::startSession() {
     ++_sessions;
-    sayRRC(0.1, RRCState::Connecting);
-    sayRRC(0.5, RRCState::CellFACH);
-    sayRRC(2.0, RRCState::CellDCH);
-    sayContexts(2.6, _sessions % 2 == 1 ? 1 : 2);
+    addRRCStep(0.1, RRCState::Connecting);
+    addRRCStep(0.5, RRCState::CellFACH);
+    addRRCStep(2.0, RRCState::CellDCH);
+    addContextsStep(2.6, _sessions % 2 == 1 ? 1 : 2);
 }
 
 void UTRANScenario::endSession() {
-    sayContexts(0.1, 0);
-    sayRRC(1, RRCState::CellFACH);
-    sayRRC(5, RRCState::CellPCH);
-    say(5.1, [this] { return utranReports::quality(_context); });
-    sayRRC(10, RRCState::URAPCH);
-    sayRRC(15, RRCState::Disconnected);
+    addContextsStep(0.1, 0);
+    addRRCStep(1, RRCState::CellFACH);
+    addRRCStep(5, RRCState::CellPCH);
+    addStep(5.1, [this] { return utranReports::quality(_context); });
+    addRRCStep(10, RRCState::URAPCH);
+    addRRCStep(15, RRCState::Disconnected);
 }
 
 void UTRANScenario::startCall() {
-    sayRRC(0.1, RRCState::Connecting);
-    say(0.7, [this] {
+    addRRCStep(0.1, RRCState::Connecting);
+    addStep(0.7, [this] {
         _phone.call = true;
         _phone.rrc = RRCState::CellDCH;
         return utranReports::rrc(_context);
@@ -112,33 +112,33 @@ void UTRANScenario::startCall() {
 }
 
 void UTRANScenario::endCall() {
-    say(0.3, [this] {
+    addStep(0.3, [this] {
         _phone.call = false;
         _phone.rrc = RRCState::Disconnected;
         return utranReports::rrc(_context);
     });
-    say(0.4, [this] { return utranReports::quality(_context); });
+    addStep(0.4, [this] { return utranReports::quality(_context); });
 }
 
 void UTRANScenario::powerOff() {
-    sayRRC(0.1, RRCState::Connecting);
-    sayRRC(0.6, RRCState::CellDCH);
-    say(2, [this] {
+    addRRCStep(0.1, RRCState::Connecting);
+    addRRCStep(0.6, RRCState::CellDCH);
+    addStep(2, [this] {
         _phone.rrc = RRCState::Disconnected;
         _phone.radio = UTRANPhone::Radio::Off;
         _phone.serving.reset();
         _phone.registered = false;
         return utranReports::rrc(_context);
     });
-    say(2.1, [this] { return utranReports::quality(_context); });
-    say(2.2, [] { return records::utranNeighbours({}); });
-    say(2.3, [] { return records::utranGSMNeighbours({}); });
+    addStep(2.1, [this] { return utranReports::quality(_context); });
+    addStep(2.2, [] { return records::utranNeighbours({}); });
+    addStep(2.3, [] { return records::utranGSMNeighbours({}); });
 }
 
 void UTRANScenario::drive(double seconds) {
     _network.drive(seconds);
     if (_phone.serving)
-        _phone.serving = measuredAnew(*_phone.serving, _network.cells());
+        _phone.serving = updatedMeasurement(*_phone.serving, _network.cells());
 }
 
 void UTRANScenario::react() {
@@ -147,10 +147,10 @@ void UTRANScenario::react() {
                         cells.front().rscp_dBm >= _phone.serving->rscp_dBm + reselectionMargin_dB;
     if (timeToReselect(better, reselectionTime_s)) {
         _phone.serving = cells.front();
-        say(0, [this] { return utranReports::serving(_context); });
+        addStep(0, [this] { return utranReports::serving(_context); });
         return;
     }
-    // Idle in an area that the network does not know the phone to be in, it registers anew.
+    // Idle in an area that the network does not know the phone to be in, it registers again.
     if (script().empty() && _phone.registered && _phone.rrc == RRCState::Disconnected && _phone.serving &&
         _phone.serving->cell.area != _phone.registeredArea)
         registerWithNetwork();
@@ -160,9 +160,9 @@ void UTRANScenario::addReports(DriveScript& due) {
     schedule(reportsOf(_phone), _context, 0.137, due);
 }
 
-DamageMaterial UTRANScenario::damageMaterial(std::size_t number) {
+UnusualMessageParts UTRANScenario::unusualMessageParts(std::size_t number) {
     // Which records are spoilt changes from round to round of the kinds of damage.
-    const std::size_t round = number / everyDamage.size();
+    const std::size_t round = number / allUnusualMessages.size();
     RecordBuilder tooShort =
         round % 2 == 0 ? records::utranServingCell(_phone.serving ? _phone.serving->cell : UTRANCell{}, false)
                        : records::utranRRCState(_phone.rrc);

@@ -15,8 +15,8 @@ namespace velmora {
 /// - Registration: Connecting, Cell DCH and back to Disconnected; from then on the cell allows all calls.
 /// - Idle: the serving cell as ASET, up to five neighbours as MSET, further ones as DSET, those of the other
 ///   network without a status; their levels rise and fall. Reselection when a neighbour has been 5 dB better
-///   for 3 s, and a registration anew where the area changes. Six GSM neighbours are measured all along,
-///   which the decoder does not show.
+///   for 3 s, and a new registration where the area changes. Six GSM neighbours are measured all along, which
+///   the decoder does not show.
 /// - A packet session: Connecting, Cell Fach, Cell DCH with one context, the block errors of two transport
 ///   channels and the signal-to-interference ratios of two composite ones with one and four time slots; its
 ///   end goes over Cell Fach, Cell PCH and Cell URA PCH to Disconnected, and the quality lists empty.
@@ -24,10 +24,10 @@ namespace velmora {
 /// - A packet session with two contexts; then power-off with every list empty, and again from the start.
 ///
 /// About ten messages come a second. The extra stream reports the SIM, the cells around and the contexts, as
-/// binary and XML property lists in turn. Every ten seconds or so a message is odd (see Damage): the records
-/// of the RRC state and of the serving cell come too short alternately - after the former the state is
-/// unknown until the next report - and each of the three counted records comes with a count too high. Main
-/// thread only.
+/// binary and XML property lists in turn. About every ten seconds a message is unusual (see UnusualMessage):
+/// the records of the RRC state and of the serving cell come too short alternately - after the former the
+/// state is unknown until the next report - and each of the three counted records comes with a count too
+/// high. Main thread only.
 class UTRANScenario final : public DriveScenario {
 public:
     explicit UTRANScenario(std::uint64_t seed);
@@ -36,7 +36,7 @@ public:
 private:
     static const Phase phases[];
 
-    /// What the phone goes through; each puts its steps on the script, from now on.
+    /// The phone's procedures; each adds its steps to the script, from now on.
     void powerOn();
     void registerWithNetwork();
     void startSession();
@@ -48,10 +48,10 @@ private:
     void drive(double seconds) override;
     void react() override;
     void addReports(DriveScript& due) override;
-    [[nodiscard]] DamageMaterial damageMaterial(std::size_t number) override;
+    [[nodiscard]] UnusualMessageParts unusualMessageParts(std::size_t number) override;
 
-    void sayRRC(double delay, records::RRCState state);
-    void sayContexts(double delay, int count);
+    void addRRCStep(double delay, records::RRCState state);
+    void addContextsStep(double delay, int count);
 
     UTRANNetwork _network;
     UTRANPhone _phone;

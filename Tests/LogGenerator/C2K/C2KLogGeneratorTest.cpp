@@ -9,7 +9,7 @@
 #include "Tests/Support/FakeClock.h"
 #include "Tests/Support/FakeResources.h"
 #include "Tests/Support/Hex.h"
-#include "Tests/Support/NotedEffects.h"
+#include "Tests/Support/RecordedEffects.h"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
@@ -34,7 +34,7 @@ protected:
     C2KLogGeneratorTest() {
         resources.put("C2KTemplate", "plist",
                       dictionary({{"Fingers", "kFingerC2I"},
-                                  {"Maker", "kNobodyMakesThis"},
+                                  {"Maker", "kUnusedKey"},
                                   {"EV-DO", dictionary({{"_sorted", "_sorted"},
                                                         {"2;Channel", "kChannel"},
                                                         {"1;PN Offset", "kServingPNOffset"},
@@ -103,7 +103,7 @@ TEST_F(C2KLogGeneratorTest, LookupNamesLabelAndScreenOfEveryValueKey) {
     std::vector<std::string> keys;
     for (const auto& [key, targets] : lookup)
         keys.push_back(key);
-    EXPECT_THAT(keys, ElementsAre("kFingerC2I", "kNobodyMakesThis", "kChannel", "kServingPNOffset"));
+    EXPECT_THAT(keys, ElementsAre("kFingerC2I", "kUnusedKey", "kChannel", "kServingPNOffset"));
     const Array& targets = *lookup["kFingerC2I"].asArray();
     ASSERT_EQ(targets.size(), 2u);
     const Dictionary& root = *state["Display"].asDictionary();
@@ -113,7 +113,7 @@ TEST_F(C2KLogGeneratorTest, LookupNamesLabelAndScreenOfEveryValueKey) {
     EXPECT_EQ((*targets[1].asDictionary())["dict"].asDictionary(), root["EV-DO"].asDictionary());
 }
 
-TEST_F(C2KLogGeneratorTest, ValuesStandUnderAllTheirLabelsAndStay) {
+TEST_F(C2KLogGeneratorTest, ValuesAreShownUnderAllTheirLabelsAndPersist) {
     EXPECT_THAT(update(noFingers()),
                 ElementsAre(CapturedLog::Line{LogPriority::Warning, "Processing the template"},
                             CapturedLog::Line{LogPriority::Warning, "Processing the template"}));
@@ -184,12 +184,12 @@ TEST_F(C2KLogGeneratorTest, Framing) {
     }
 }
 
-TEST_F(C2KLogGeneratorTest, ValuesThatAMessagePublishesAreTold) {
+TEST_F(C2KLogGeneratorTest, PublishedValuesAreReported) {
     build();
     const CapturedLog log;
-    NotedEffects effects;
+    RecordedEffects effects;
     generator->updateStateTelling(state, noFingers(), effects);
-    EXPECT_EQ(effects.kind, NotedEffects::Kind::Values);
+    EXPECT_EQ(effects.kind, RecordedEffects::Kind::Values);
     EXPECT_EQ(effects.code, 0x108AU);
     EXPECT_THAT(effects.members, ElementsAre(std::pair<std::string, Value>("kFingerC2I", "(none)")));
     EXPECT_EQ(display(), fingersShown);
@@ -284,7 +284,7 @@ TEST_F(C2KLogGeneratorTest, SaveContentsEndInTheLog) {
     EXPECT_EQ(dlf["DLF"].asData()->from(161), noFingers().from(1));
 }
 
-TEST_F(C2KLogGeneratorTest, NewDecoderGoesOnInTheStateOfTheEarlierOne) {
+TEST_F(C2KLogGeneratorTest, NewDecoderContinuesWithTheState) {
     const auto rateRecord = [](std::uint32_t sequence, std::uint32_t packets) {
         return recordWith(0x1192, 241, {{13, 4, sequence}, {17, 4, packets}});
     };
@@ -378,13 +378,13 @@ TEST(C2KProcessTemplateTest, CopiesMarkersSkipsForeignValuesAndNests) {
     std::vector<std::string> keys;
     for (const auto& [key, targets] : lookup)
         keys.push_back(key);
-    EXPECT_THAT(keys, ElementsAre("", "kC")); // an empty text is a key that nobody produces
+    EXPECT_THAT(keys, ElementsAre("", "kC")); // an empty text is a key that no parser publishes
     EXPECT_EQ(lookup["kC"].asArray()->size(), 2u);
     // One a level, and the levels are four: Innermost, Inner, Hollow, the root.
     EXPECT_EQ(log.lines(), LogLines(4, {LogPriority::Warning, "Processing the template"}));
 }
 
-TEST(C2KProcessTemplateTest, EmptyTemplateSaysSoToo) {
+TEST(C2KProcessTemplateTest, AnEmptyTemplateIsReportedToo) {
     const DictionaryRef display = makeDictionary();
     Dictionary lookup;
     const CapturedLog log;
@@ -414,7 +414,7 @@ TEST_F(C2KLogGeneratorTest, LabelsOfAnyLengthShowTheirFields) {
         const std::string label(length, 'L');
         resources.put("C2KTemplate", "plist", dictionary({{label, "kColorCode"}, {"Channel", "kChannel"}}));
         Dictionary itsState;
-        // EV-DO status: 50 bytes, all zero behind the header.
+        // EV-DO status: 50 bytes, all zero after the header.
         generator->updateState(itsState, recordWith(0x1183, 50));
         generator->updateState(itsState, recordWith(0x1183, 50));
         EXPECT_EQ(shown(generator->display(itsState)), "{" + label + " '0', Channel '0'}") << length;

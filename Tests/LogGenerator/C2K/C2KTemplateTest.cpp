@@ -50,7 +50,7 @@ TEST(C2KTemplateTest, ShowsEveryValueKeyAndNothingElse) {
     EXPECT_EQ(named, std::set<std::string>(valueKeys().begin(), valueKeys().end()));
 }
 
-TEST(C2KTemplateTest, MarkersStandUnderTheirOwnKey) {
+TEST(C2KTemplateTest, MarkersHaveTheirOwnKey) {
     walk(shippedTemplate(), [](const std::string& label, const Value& value) {
         EXPECT_EQ(label == "_sorted", value == Value("_sorted")) << label;
     });

@@ -108,7 +108,7 @@ TEST(ForwardLinkDataRateTest, EveryCountersWeight) {
     }
 }
 
-TEST(ForwardLinkDataRateTest, EitherNumberMissingSeedsAnew) {
+TEST(ForwardLinkDataRateTest, AMissingCounterRestartsTheRate) {
     for (const char* key : {"FLDataSeqNum", "FLDataSent"}) {
         ParserHarness parser;
         parser.update(forward(1, 0)).update(forward(2, 100));

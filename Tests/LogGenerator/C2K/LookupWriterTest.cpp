@@ -46,7 +46,7 @@ TEST_F(LookupWriterTest, AKeyWithoutAnArrayIsNotShown) {
     EXPECT_EQ(shown(screen), "{}");
 }
 
-TEST_F(LookupWriterTest, TheFirstOddTargetEndsIt) {
+TEST_F(LookupWriterTest, TheFirstInvalidTargetEndsIt) {
     const Value frozen = Value(makeDictionary()).copy();
     const Value missingDict = std::make_shared<Dictionary>(Dictionary{{"key", "Odd"}});
     const Value missingKey = std::make_shared<Dictionary>(Dictionary{{"dict", other}});
@@ -61,7 +61,7 @@ TEST_F(LookupWriterTest, TheFirstOddTargetEndsIt) {
     }
 }
 
-TEST_F(LookupWriterTest, AnOddTargetEndsNoOtherKey) {
+TEST_F(LookupWriterTest, AnInvalidTargetEndsNoOtherKey) {
     lookup->set("kB", std::make_shared<Array>(Array{target("B", screen)}));
     publishTo({"text"});
     publish("kB", "+1.00 dB");

@@ -196,7 +196,7 @@ TEST(OneXStatusTest, MSetsThePilotsStride) {
               "{_sorted '_sorted', 0;100 '-3.01 dB', 1;18 '(ref pilot) +0.00 dB'}");
 }
 
-TEST(OneXStatusTest, EveryPilotWithTheReferencePNSaysSo) {
+TEST(OneXStatusTest, EveryPilotWithTheReferencePNIsMarked) {
     EXPECT_EQ(activeSetOf(withFields(active, {{12, 2, 270}})),
               "{_sorted '_sorted', 0;270 '(ref pilot) -3.01 dB', 1;270 '(ref pilot) +0.00 dB'}");
 }
@@ -226,7 +226,7 @@ TEST(OneXStatusTest, MissingSubPacketsAreNamed) {
     }
 }
 
-TEST(OneXStatusTest, SubPacketThatEndsBehindTheRecordIsTakenUpTo16Bytes) {
+TEST(OneXStatusTest, SubPacketMayEndUpTo16BytesPastTheRecord) {
     // The finger sub-packet, never read, begins at 91 of 95: 91 + 20 = 111 < 17 + 95, 91 + 21 = 112 is not.
     ParserHarness taken;
     taken.update(withFields(idleRecord(), {{93, 2, 20}}));
@@ -258,8 +258,7 @@ TEST(OneXStatusTest, EveryPrefix) {
             EXPECT_EQ(parser.lines(), error(is + "its subpkt#1 needs at least 29 bytes."));
         } else if (length < 43) {
             EXPECT_EQ(parser.lines(), error(is + "its subpkt#2 needs at least 43 bytes."));
-        } else if (length <=
-                   74) { // the active set's end, 91, lies at or behind 17 + length: for two searches
+        } else if (length <= 74) { // the active set's end, 91, lies at or past 17 + length: for two searches
             LogLines expected(2, error("Log code error in subpkt#2: bad size (52).")[0]);
             expected.push_back(missing("ss=1,rf=1,ai=0,fi=0")[0]);
             EXPECT_EQ(parser.lines(), expected);
@@ -280,7 +279,7 @@ struct Cut {
     const char* line; ///< empty where all that is read is there
 };
 
-TEST(OneXStatusTest, WhatATakenSubPacketLacksDropsTheRecord) {
+TEST(OneXStatusTest, AnIncompleteSubPacketDropsTheRecord) {
     // Sub-packets are 8, 14, 52 and 4 bytes long; the last of them ends at 95.
     const Data shortSize = withFields(active, {{2, 2, 12}});
     const Cut cuts[] = {
@@ -343,7 +342,7 @@ TEST(OneXStatusTest, LeavingTrafficShowsTheLastAverageOnce) {
     EXPECT_EQ(parser.text("k1xTrafficFER"), "untouched");
 }
 
-TEST(OneXStatusTest, AnAverageThatIsNoNumberIsLeftAlone) {
+TEST(OneXStatusTest, AnAverageThatIsNoNumberIsIgnored) {
     ParserHarness parser;
     parser.state.set("TrafficFER", "0.25");
     parser.update(idleRecord());

@@ -55,7 +55,7 @@ INSTANTIATE_TEST_SUITE_P(
         Case{"BehindALongerOne", 2, "01 00 06 00 AA BB 07 00 04 00", Outcome::Found, 1, 23, quiet},
         Case{"BehindTheCount", 1, "01 00 04 00 07 00 04 00", Outcome::Missing, 0, 0, quiet},
         Case{"NotThere", 2, "01 00 04 00 02 00 04 00", Outcome::Missing, 0, 0, quiet},
-        // The record has 21 bytes; an end at 17 + 21 = 38 or behind is too far, so 17 + 21.
+        // The record has 21 bytes; an end at 17 + 21 = 38 or later is too far, so 17 + 21.
         Case{"JustNotTooLarge", 1, "07 00 14 00", Outcome::Found, 0, 17, quiet},
         Case{"TooLargeAlthoughWanted", 1, "07 00 15 00", Outcome::Missing, 0, 0,
              error("Log code error in subpkt#0: bad size (21).")},

@@ -99,7 +99,7 @@ TEST(TrafficFERTest, EveryPrefix) {
         if (length < 17)
             EXPECT_EQ(parser.lines(),
                       error("Log code 0x119d is " + number + " bytes long but must be at least 17 bytes."));
-        else if (length >= 21 && length <= 25) // its end, 42, lies at or behind 17 + length
+        else if (length >= 21 && length <= 25) // its end, 42, lies at or past 17 + length
             EXPECT_EQ(
                 parser.lines(),
                 (LogLines{{LogPriority::Error, "Log code error in subpkt#0: bad size (25)."},

@@ -131,7 +131,7 @@ TEST(BinaryCellReaderTest, OtherKeysAreReadAndLeftOut) {
     EXPECT_EQ(readOf(listOf({oneCell, oneEntry, hex("10 07"), hex("10 07")})), "left"); // a key is a text
 }
 
-TEST(BinaryCellReaderTest, OfAKeyThatStandsThereTwiceTheLaterValueCounts) {
+TEST(BinaryCellReaderTest, TheLastValueOfADuplicateKeyIsUsed) {
     const Data twice = hex("D2 02 02 03 04");
     EXPECT_EQ(readOf(listOf({oneCell, twice, mcc, hex("10 07"), hex("10 08")})), "[4 2 MCC=8]");
     EXPECT_EQ(readOf(listOf({oneCell, twice, mcc, hex("10 07"), hex("51 37")})), "[4 2]");

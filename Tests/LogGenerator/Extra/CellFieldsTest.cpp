@@ -34,7 +34,7 @@ Cell cellWith(std::int32_t mcc, std::int32_t mnc) {
     return cell;
 }
 
-TEST(CellFieldsTest, LongestTableIsShownWhole) {
+TEST(CellFieldsTest, LongestTableIsShownCompletely) {
     const DictionaryRef node = makeDictionary();
     std::string expected;
     for (std::size_t i = 0; i < labels.size(); ++i)

@@ -95,7 +95,7 @@ TEST_F(SimInfoTest, AbsentFilesLeaveTheirEarlierValues) {
     EXPECT_EQ(Value(node), Value(dictionary({{"EF-LOCI", "earlier"}, {"EF-ICCID", "8988"}})));
 }
 
-TEST_F(SimInfoTest, ValuesStandAsTheyAre) {
+TEST_F(SimInfoTest, ValuesAreUnchanged) {
     section.updateWithData(extraRecord(0, dictionary({{"kSimFile_FPLMN", array({"00101", 7})}})), 0xFF0000);
     EXPECT_EQ((*node)["EF-FPLMN"], Value(array({"00101", 7})));
 }
@@ -128,7 +128,7 @@ struct Unreadable {
 
 class UnreadableSimTest : public SimInfoTest, public testing::WithParamInterface<Unreadable> {};
 
-TEST_P(UnreadableSimTest, SaysSoAndRaisesWhatNothingCatches) {
+TEST_P(UnreadableSimTest, ReportsAndThrowsAnUncaughtException) {
     EXPECT_THROW(section.updateWithData(hex(GetParam().record), 0xFF0000),
                  LogCode_0xFF0000::UnknownDataException);
     EXPECT_THAT(log.lines(),
@@ -144,7 +144,7 @@ INSTANTIATE_TEST_SUITE_P(
                     Unreadable{"Rubbish", "FF 0E 00 00 00 00 00 00 00 00 00 00 00 41 42"}),
     [](const auto& test) { return std::string(test.param.odd); });
 
-TEST(UnknownDataExceptionTest, EndsTheProgramWithItsOwnWords) {
+TEST(UnknownDataExceptionTest, EndsTheProgramWithItsOwnMessage) {
     EXPECT_DEATH(
         {
             SimInfo section;
@@ -165,7 +165,7 @@ protected:
     PDPContextList section;
 };
 
-TEST_F(PDPContextListTest, ShowsTheContextsAsTheyStand) {
+TEST_F(PDPContextListTest, ShowsTheContextsUnchanged) {
     const Value contexts = array({dictionary({{"APN", "internet"}}), "second"});
     section.updateWithData(extraRecord(2, contexts), 0xFF0002);
     EXPECT_EQ(Value(node), contexts);
@@ -200,7 +200,7 @@ TEST_F(PDPContextListTest, AnythingElseChangesNothingAndSaysNothing) {
     EXPECT_THAT(log.textsAt(LogPriority::Error), IsEmpty());
 }
 
-TEST(CellInfoArrayReaderTest, HoldsWhatItParsedWhateverItsKind) {
+TEST(CellInfoArrayReaderTest, HoldsParsedValuesOfAnyKind) {
     const CapturedLog log;
     EXPECT_EQ(CellInfoArrayReader(extraRecord(1, "text")).parsed(), Value("text"));
     EXPECT_EQ(CellInfoArrayReader(extraRecord(1, array({"cell"}))).cells()->size(), 1u);

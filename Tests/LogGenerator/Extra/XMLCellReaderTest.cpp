@@ -98,7 +98,7 @@ TEST(XMLCellReaderTest, TechnologyAndTypeAreTexts) {
     EXPECT_EQ(readOf(listOf(cellOf(type + "<integer>0</integer>"))), "left");
 }
 
-TEST(XMLCellReaderTest, OfAKeyThatStandsThereTwiceTheLaterValueCounts) {
+TEST(XMLCellReaderTest, TheLastValueOfADuplicateKeyIsUsed) {
     EXPECT_EQ(readOf(listOf(cellOf(mcc + "<integer>7</integer>" + mcc + "<integer>8</integer>"))),
               "[4 2 MCC=8]");
     EXPECT_EQ(readOf(listOf(cellOf(mcc + "<integer>7</integer>" + mcc + "<string>8</string>"))), "[4 2]");

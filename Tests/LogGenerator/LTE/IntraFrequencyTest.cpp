@@ -105,7 +105,7 @@ TEST(ConnectedModeMeasurementMisc, ReadsUnsigned16Bits) {
     EXPECT_EQ(section.text("Subframe Number"), "65534");
 }
 
-TEST(MeasuredNeighborCells, EndsWithTheLastNeighbourThatIsWhole) {
+TEST(MeasuredNeighborCells, EndsWithTheLastCompleteNeighbour) {
     expectPrefixes(inArray<MeasuredNeighborCells>, record(0xB179, twoAndThree), 29, "Measured Neighbor Cells",
                    [](std::size_t length) { return list(neighbours, (length - 29) / 6); });
     SectionHarness section = inArray<MeasuredNeighborCells>();
@@ -161,7 +161,7 @@ TEST(DetectedCells, FollowTheAnnouncedNeighbours) {
               "[{Physical Cell ID '511'}, {Physical Cell ID '418'}, {Physical Cell ID '159'}]");
     section.update(withByte(record(0xB179, twoAndThree), 27, 0));
     EXPECT_EQ(section.node(), "[{Physical Cell ID '1'}, {Physical Cell ID '0'}, {Physical Cell ID '0'}]");
-    // With one more they lie behind it, where the record has none: 29 + 18 is its end.
+    // With one more they lie past it, where the record has none: 29 + 18 is its end.
     section.update(withByte(record(0xB179, twoAndThree), 27, 3));
     EXPECT_EQ(section.node(), "[]");
     EXPECT_THAT(section.errors(), ElementsAre("Record 0xB179: 0 of 3 entries"));
@@ -169,7 +169,7 @@ TEST(DetectedCells, FollowTheAnnouncedNeighbours) {
     EXPECT_THAT(section.errors(), ElementsAre("Record 0xB179: 0 of 3 entries"));
 }
 
-TEST(DetectedCells, EndWithTheLastThatIsWhole) {
+TEST(DetectedCells, EndWithTheLastCompleteCell) {
     SectionHarness section = inArray<DetectedCells>();
     section.update(withByte(record(0xB179, twoAndThree), 28, 4));
     EXPECT_EQ(section.node(), list(detected, 3));

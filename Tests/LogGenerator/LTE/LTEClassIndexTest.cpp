@@ -31,7 +31,7 @@ TEST(LTEClassIndex, HoldsElevenSectionsUnderTheirNames) {
     EXPECT_EQ(index.getClass("LTE Serving Cell Info"), nullptr);
 }
 
-TEST(LTEClassIndex, SubscribersStandInTheOrderOfCreation) {
+TEST(LTEClassIndex, SubscribersAreInOrderOfCreation) {
     const LTEClassIndex index;
     EXPECT_THAT(subscribers(index, 0xB0C1), ElementsAre("Serving Cell Info"));
     EXPECT_THAT(subscribers(index, 0xB0C2), ElementsAre("Serving Cell Info"));
@@ -53,7 +53,7 @@ TEST(LTEClassIndex, CreatesTheSectionsInOrder) {
     expectCodeCounts(log, {3, 1, 1, 1, 1, 1, 1, 1, 1, 1, 1});
 }
 
-TEST(LTEClassIndex, SaysOnTheConsoleThatItGoes) {
+TEST(LTEClassIndex, PrintsItsDestruction) {
     EXPECT_EQ(printedBy([] { const LTEClassIndex index; }),
               "Deallocing LTEClassIndex\nDeallocing ClassIndex\n");
 }

@@ -109,7 +109,7 @@ std::string list(std::size_t count) {
     return result.append("]");
 }
 
-TEST(NeighborCellsList, EndsWithTheLastCellThatIsWhole) {
+TEST(NeighborCellsList, EndsWithTheLastCompleteCell) {
     const Data two = record(0xB180, twoCells);
     ASSERT_EQ(two.size(), 61u);
     expectPrefixes(inArray<NeighborCellsList>, two, 21, "Neighbor Cells List",

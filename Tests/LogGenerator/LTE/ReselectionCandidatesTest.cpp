@@ -119,7 +119,7 @@ void expectDetails(std::uint8_t type, std::span<const BitField> fields, std::siz
 }
 
 TEST(ReselectionCandidatesList, ReadsEveryFieldFromItsBits) {
-    // Offsets from behind the candidate's header.
+    // Offsets from the end of the candidate's header.
     constexpr BitField lte[] = {
         {"E ARFCN", 0, 0, 16, "0", "1", "65535"},
         {"Cell ID", 2, 7, 9, "0", "1", "511"},
@@ -180,7 +180,7 @@ struct EndCase {
     std::size_t shown;
 };
 
-TEST(ReselectionCandidatesList, EndsBeforeTheFirstCandidateThatIsNotWhole) {
+TEST(ReselectionCandidatesList, EndsBeforeTheFirstIncompleteCandidate) {
     const EndCase cases[] = {
         {"nothing", 1, "", 0},
         {"a header less a byte", 1, "01 00 05", 0},

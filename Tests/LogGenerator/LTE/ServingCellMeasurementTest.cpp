@@ -88,7 +88,7 @@ Data measurementWith(const std::vector<ByteAt>& bytes) {
     return result;
 }
 
-TEST(ServingCellMeasurement, OneRawValueStandsForNotPresent) {
+TEST(ServingCellMeasurement, OneRawValueMeansNotPresent) {
     const NotPresentCase cases[] = {
         // P_Max: bit 7 of byte 26 is its lowest, bit 5 of byte 27 its highest.
         {"P_Max 63", {{26, 0x80}, {27, 0x1F}}, "P_Max", "33 dBm"},

@@ -52,7 +52,7 @@ TEST(EquivalentPLMNList, NoEntriesEmptyTheList) {
     EXPECT_THAT(section.errors(), IsEmpty());
 }
 
-TEST(EquivalentPLMNList, EndsWithTheLastWholeEntry) {
+TEST(EquivalentPLMNList, EndsWithTheLastCompleteEntry) {
     const Data two = record(0x7150, "00 00 00 02   02 03 06 01 02 00   02 07 00");
     ASSERT_EQ(two.size(), 26u);
     expectPrefixes(make, two, 17, "Equivalent PLMN List", [](std::size_t length) -> std::string {

@@ -78,7 +78,7 @@ TEST(HSDPAInformation, ShowsThePrimaryProcesses) {
                                          {LogPriority::Error, "Record 0x4221: 1 of 2 entries"}}));
 }
 
-TEST(HSDPAInformation, SecondaryProcessesLie162BytesBehindEachPrimaryOne) {
+TEST(HSDPAInformation, SecondaryProcessesAre162BytesAfterEachPrimaryOne) {
     std::vector<std::uint8_t> gap(162 - 9, 0xEE);
     const Data full = joined(status("01 01"), hex(processBytes), Data(std::move(gap)), hex(otherBytes));
     ASSERT_EQ(full.size(), 189u);

@@ -58,7 +58,7 @@ TEST(NeighboringCells, ShowsWhatTheBasebandMeasures) {
     EXPECT_THAT(section.errors(), IsEmpty());
 }
 
-TEST(NeighboringCells, EndsWithTheLastWholeNeighbour) {
+TEST(NeighboringCells, EndsWithTheLastCompleteNeighbour) {
     expectPrefixes(make, measured("02", twoCells), 29, "NeighboringCells", [](std::size_t length) {
         return length < 43 ? "[]" : length < 57 ? list({firstRow}) : list({firstRow, secondRow});
     });
@@ -82,7 +82,7 @@ TEST(NeighboringCells, ShowsTheBSICOfAKnownChannel) {
     EXPECT_EQ(section.node(), list({"{ARFCN '512', RSSI '171', C1 Value '-10', BSIC '42'}", secondRow}));
 }
 
-TEST(NeighboringCells, TheLaterBSICOfAChannelWins) {
+TEST(NeighboringCells, TheLastBSICOfAChannelIsUsed) {
     SectionHarness section = make();
     section.update(record(0x51FF, "00 03   00 02 01 00   FF FF FF 00   00 02 02 00"));
     section.update(measured("02", twoCells));
@@ -101,7 +101,7 @@ TEST(NeighboringCells, EveryListOfBSICsReplacesTheEarlierOne) {
     EXPECT_EQ(section.node(), list({firstRow, secondRow}));
 }
 
-TEST(NeighboringCells, ListOfBSICsEndsWithTheLastWholeEntry) {
+TEST(NeighboringCells, ListOfBSICsEndsWithTheLastCompleteEntry) {
     const Data full = record(0x51FF, "00 02   FF FF 2B 00   00 02 2A 00");
     ASSERT_EQ(full.size(), 23u);
     for (std::size_t length = 0; length <= full.size(); ++length) {
@@ -126,7 +126,7 @@ TEST(NeighboringCells, ListOfBSICsEndsWithTheLastWholeEntry) {
     }
 }
 
-TEST(NeighboringCells, ShowsWhatTheServiceKnows) {
+TEST(NeighboringCells, ShowsTheServicesCells) {
     struct Case {
         const char* name;
         Value cell;

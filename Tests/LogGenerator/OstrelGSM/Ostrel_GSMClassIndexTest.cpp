@@ -45,7 +45,7 @@ TEST(Ostrel_GSMClassIndex, HoldsTwentySixSectionsUnderTheirNames) {
     EXPECT_EQ(index.getClass("HSDPAInformation"), nullptr);
 }
 
-TEST(Ostrel_GSMClassIndex, SubscribersStandInTheOrderOfCreation) {
+TEST(Ostrel_GSMClassIndex, SubscribersAreInOrderOfCreation) {
     const Ostrel_GSMClassIndex index;
     EXPECT_THAT(subscribers(index, 0x417A),
                 ElementsAre("Active Set", "Detected Set", "Monitored Set", "Virtual Active Set"));
@@ -92,7 +92,7 @@ TEST(Ostrel_GSMClassIndex, CreatesTheSectionsInOrder) {
     expectCodeCounts(log, {1, 0, 7, 4, 1, 3, 1, 2, 0, 0, 1, 1, 0, 2, 3, 2, 1, 4, 1, 0, 2, 5, 1, 1, 1, 1});
 }
 
-TEST(Ostrel_GSMClassIndex, SaysOnTheConsoleThatItGoes) {
+TEST(Ostrel_GSMClassIndex, PrintsItsDestruction) {
     EXPECT_EQ(printedBy([] { const Ostrel_GSMClassIndex index; }),
               "Deallocing Ostrel_GSMClassIndex\nDeallocing ClassIndex\n");
 }

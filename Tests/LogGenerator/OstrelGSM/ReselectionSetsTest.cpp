@@ -126,7 +126,7 @@ TEST(ReselectionSets, BothReadTheSameBytesWhereBothCountsAreSet) {
                            "Downlink Frequency '1', Ranking Value '6', Rank Cell RSCP '4 dB'}]");
 }
 
-TEST(UMTSSet, ShowsWhatTheServiceKnows) {
+TEST(UMTSSet, ShowsTheServicesCells) {
     struct Case {
         const char* name;
         Value cell;

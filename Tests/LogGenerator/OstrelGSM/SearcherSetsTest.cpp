@@ -140,7 +140,7 @@ TEST(ActiveSet, OnlySetTypeZeroIsActive) {
     }
 }
 
-TEST(ActiveSet, EndsWithTheLastCellWhoseMeasurementIsWhole) {
+TEST(ActiveSet, EndsWithTheLastCellWithACompleteMeasurement) {
     const Cell active{300, 0, {417647, 0, 0}};
     const Data two = searcher(-1000, {active, active});
     ASSERT_EQ(two.size(), 16u + 30 + 88);
@@ -155,7 +155,7 @@ TEST(ActiveSet, EndsWithTheLastCellWhoseMeasurementIsWhole) {
     EXPECT_THAT(section.errors(), ElementsAre("Record 0x417A: 1 of 2 entries"));
     section.update(prefixOf(two, 20)); // not even the cells
     EXPECT_THAT(section.errors(), ElementsAre("Record 0x417A: 0 of 2 entries"));
-    // A greater count moves the measurements back, here behind the record's end.
+    // A greater count moves the measurements back, here past the record's end.
     section.update(withByte(two, 15, 255));
     EXPECT_EQ(section.node(), "[]");
     EXPECT_THAT(section.errors(), ElementsAre("Record 0x417A: 0 of 255 entries"));

@@ -77,7 +77,7 @@ TEST(UMTSRRInfo, ShowsTheMeanTransmitPower) {
     }
 }
 
-TEST(UMTSRRInfo, TakesTheWholeTransmitPowersAlone) {
+TEST(UMTSRRInfo, TakesOnlyCompleteTransmitPowers) {
     const Data two = powers({288, 388}); // 10 and 20
     ASSERT_EQ(two.size(), 44u);
     expectPrefixes(make, two, 16, "UMTSRRInfo", [](std::size_t length) {

@@ -74,7 +74,7 @@ TEST(RRC_State, AShortRecordIsWarnedOfAndDecodedAllTheSame) {
 }
 
 TEST(RRC_State, DescribesTheWholeNodeOnOneLine) {
-    // A template of somebody's own may hold more under the section's name.
+    // A user's template may have more under the section's name.
     const Value node = std::make_shared<Dictionary>(Dictionary{
         {"Unit", "1"},
         {"State", "?"},

@@ -27,7 +27,7 @@ TEST(UTRANClassIndex, HoldsEightSectionsUnderTheirNames) {
     EXPECT_EQ(index.getClass("RRC_State"), nullptr);
 }
 
-TEST(UTRANClassIndex, SubscribersStandInTheOrderOfCreation) {
+TEST(UTRANClassIndex, SubscribersAreInOrderOfCreation) {
     const UTRANClassIndex index;
     EXPECT_THAT(subscribers(index, 0xD0E0), ElementsAre("RRC Info"));
     EXPECT_THAT(subscribers(index, 0xD0E2), ElementsAre("Serving Cell Info"));
@@ -46,7 +46,7 @@ TEST(UTRANClassIndex, CreatesTheSectionsInOrder) {
     expectCodeCounts(log, {1, 2, 1, 1, 1, 1, 1, 1});
 }
 
-TEST(UTRANClassIndex, PrintsTheCommonLineAloneWhenItGoes) {
+TEST(UTRANClassIndex, PrintsOnlyTheCommonLineOnDestruction) {
     EXPECT_EQ(printedBy([] { const UTRANClassIndex index; }), "Deallocing ClassIndex\n");
 }
 

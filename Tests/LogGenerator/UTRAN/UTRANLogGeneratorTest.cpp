@@ -38,7 +38,7 @@ TEST_F(UTRANGenerator, SaysEachStepOfItsCreationInOrder) {
     EXPECT_EQ(lines[11], (CapturedLog::Line{LogPriority::Error, "Created UTRANLogGenerator object"}));
 }
 
-TEST_F(UTRANGenerator, IsTheTechnologysDecoderAndGoesWithTheCommonLineAlone) {
+TEST_F(UTRANGenerator, IsTheTechnologysDecoderAndPrintsOnlyTheCommonLine) {
     ASSERT_NE(dynamic_cast<UTRANLogGenerator*>(generator.get()), nullptr);
     const LogLines expected = destructionLines({"Ostrel_GSMLogGenerator"}, generator.get());
     CapturedLog log;
@@ -107,7 +107,7 @@ protected:
     FakeResources resources;
 };
 
-TEST_F(UTRANTemplateChoice, TheNameContainsTheWordInWhateverCase) {
+TEST_F(UTRANTemplateChoice, TheNameIsMatchedIgnoringCase) {
     for (const char* name : {"UTRAN", "utran", "my_utran_view", "OstrelUtRaN2", "xUUTRANx"}) {
         FakeResources fresh;
         fresh.put(name, "plist", Value(std::make_shared<Dictionary>(Dictionary{{"Name", name}})));
@@ -140,7 +140,7 @@ TEST_F(UTRANTemplateChoice, WithoutATemplateThereIsNoDecoder) {
     EXPECT_EQ(log.lines(), (LogLines{line, line}));
 }
 
-TEST_F(UTRANTemplateChoice, WithoutAnyResourceTheLineSaysSo) {
+TEST_F(UTRANTemplateChoice, WithoutAnyResourceTheLineReportsIt) {
     CapturedLog log;
     EXPECT_EQ(UTRANLogGenerator::generator(clock), nullptr);
     EXPECT_EQ(log.lines(),

@@ -69,7 +69,7 @@ TEST_F(UTRANSectionContract, ACodeOfAnotherLeavesTheTraceWordAlone) {
     }
 }
 
-TEST_F(UTRANSectionContract, ARecordAsShortAsTheyComeIsBorne) {
+TEST_F(UTRANSectionContract, TheShortestRecordIsAccepted) {
     // A prefixed message of 13 bytes leaves a record of 11.
     for (const Contract& contract : contracts)
         for (const std::uint32_t code : contract.codes) {
@@ -95,7 +95,7 @@ TEST_F(UTRANSectionContract, WithoutANodeNothingIsWritten) {
         }
 }
 
-TEST_F(UTRANSectionContract, ANodeOfTheOtherKindIsLeftAlone) {
+TEST_F(UTRANSectionContract, ANodeOfTheOtherKindIsNotChanged) {
     const Data full = recordWith(0, 3000, {{13, 1}, {14, 0xFF}, {15, 0xFF}, {16, 0xFF}});
     for (const Contract& contract : contracts) {
         const bool wantsDictionary = contract.codes.front() == 0xD0E0 || contract.codes.front() == 0xD0E2;

@@ -5,7 +5,7 @@
 import re
 from collections.abc import Mapping, Sequence
 
-# Binary operators stand between blanks; the characters of templates, references and pointers do not.
+# Binary operators have blanks around them; the characters of templates, references and pointers do not.
 OPERATORS: Mapping[str, Sequence[str]] = {
     "<": ["<=", ">="],
     "<=": ["<", ">"],

@@ -38,7 +38,7 @@ class Laboratory:
         overlay.parent.mkdir(parents=True)
         overlay.write_text(change.changed, encoding="utf-8")
         compiled: dict[str, Path | None] = {}
-        # What seems to survive in a header is tried again with all its users compiled anew.
+        # A mutant that seems to survive in a header is tried again with all its users recompiled.
         rounds = [False, True] if change.path.endswith(".h") else [False]
         for all_users, program in itertools.product(rounds, self.graph.programs_for(change.path)):
             for target in self._objects(change.path, program, all_users):

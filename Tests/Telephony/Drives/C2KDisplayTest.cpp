@@ -38,7 +38,7 @@ protected:
     }
 };
 
-TEST_F(C2KDisplayTest, onlyOddMessagesAreReported) {
+TEST_F(C2KDisplayTest, onlyUnusualMessagesAreReported) {
     int reported = 0;
     for (const ScenarioEvent& event : twentyMinutes()) {
         const CapturedLog log(LogPriority::Warning);

@@ -64,7 +64,7 @@ TEST(C2KScenarioTest, timeAscendsAndHeadersFollowIt) {
         }
 }
 
-TEST(C2KScenarioTest, everyKindOfOddMessageComes) {
+TEST(C2KScenarioTest, everyKindOfUnusualMessageOccurs) {
     int tooShort = 0;
     int prefixed = 0;
     int wrongType = 0;

@@ -94,18 +94,18 @@ TEST(GSMScenarioTest, aboutTwentyMessagesComeASecond) {
     expectRate(tenMinutes(), 10min, 15, 25);
 }
 
-TEST(GSMScenarioTest, recordsAreAsTheirTablesSayButForTheOddOnes) {
+TEST(GSMScenarioTest, recordsMatchTheirTablesExceptUnusualOnes) {
     const RecordCensus census = censusOf(tenMinutes(), requirements);
     EXPECT_EQ(codesOf(census.good), codes);
-    // One odd message every ten seconds, a sixth of them of each kind.
+    // One unusual message every ten seconds, a sixth of them of each kind.
     EXPECT_GE(countOf(census.belowMinimum), 3U);
     EXPECT_LE(countOf(census.belowMinimum), 20U);
     EXPECT_GE(countOf(census.overrun), 3U);
     EXPECT_LE(countOf(census.overrun), 20U);
 }
 
-TEST(GSMScenarioTest, everyKindOfOddMessageComes) {
-    const OddMessages odd = oddMessagesOf(tenMinutes(), meets(requirements), codes);
+TEST(GSMScenarioTest, everyKindOfUnusualMessageOccurs) {
+    const OddMessages odd = unusualMessagesOf(tenMinutes(), meets(requirements), codes);
     for (const int count : {odd.tooShort, odd.wrongType, odd.prefixed, odd.unknownCode})
         EXPECT_GE(count, 3);
 }
@@ -250,7 +250,7 @@ TEST(GSMScenarioTest, aLocationUpdateRunsInProtocolOrder) {
     EXPECT_EQ(states, wanted);
 }
 
-TEST(GSMScenarioTest, theDriveGoesRound) {
+TEST(GSMScenarioTest, theDriveRepeats) {
     // Each round begins with a network search (registration state 5 after 0).
     int searches = 0;
     int last = -1;

@@ -86,7 +86,7 @@ TEST(IFXScenarioTest, anotherSeedGivesAnotherDrive) {
     EXPECT_EQ(messages.size(), 5U);
 }
 
-TEST(IFXScenarioTest, bothFormsComeByTurns) {
+TEST(IFXScenarioTest, bothFormsAlternate) {
     bool binary = true;
     for (const ScenarioEvent& event : driveOf<IFXScenario>(1, 1min)) {
         const std::string start(event.message.bytes().begin(), event.message.bytes().begin() + 6);

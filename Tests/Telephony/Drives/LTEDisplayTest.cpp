@@ -121,7 +121,7 @@ TEST_F(LTEDisplayTest, shownValuesArePlausible) {
     });
 }
 
-TEST_F(LTEDisplayTest, onlyTheOddMessagesAreReported) {
+TEST_F(LTEDisplayTest, onlyTheUnusualMessagesAreReported) {
     play<LTEScenario>(3, 20min, [] {});
     int wrongType = 0;
     int antennas = 0;

@@ -109,10 +109,10 @@ TEST(LTEScenarioTest, sixToEightMessagesComeASecond) {
     expectRate(twentyMinutes(), 20min, 5, 9);
 }
 
-TEST(LTEScenarioTest, recordsAreAsTheirTablesSayButForTheOddOnes) {
+TEST(LTEScenarioTest, recordsMatchTheirTablesExceptUnusualOnes) {
     const RecordCensus census = censusOf(twentyMinutes(), requirements);
     EXPECT_EQ(codesOf(census.good), codes);
-    // One odd message every ten seconds, a sixth of them of each kind, by turns of these codes.
+    // One unusual message every ten seconds, a sixth of them of each kind, alternating between these codes.
     EXPECT_EQ(codesOf(census.belowMinimum),
               (std::set<std::uint32_t>{0xB0C2, 0xB179, 0xB17F, 0xB180, 0xB186}));
     EXPECT_LE(countOf(census.belowMinimum), 40U);
@@ -122,8 +122,8 @@ TEST(LTEScenarioTest, recordsAreAsTheirTablesSayButForTheOddOnes) {
     EXPECT_LE(countOf(census.overrun), 40U);
 }
 
-TEST(LTEScenarioTest, everyKindOfOddMessageComes) {
-    const OddMessages odd = oddMessagesOf(twentyMinutes(), isGood, codes);
+TEST(LTEScenarioTest, everyKindOfUnusualMessageOccurs) {
+    const OddMessages odd = unusualMessagesOf(twentyMinutes(), isGood, codes);
     for (const int count : {odd.tooShort, odd.wrongType, odd.prefixed, odd.unknownCode})
         EXPECT_GE(count, 3);
 }

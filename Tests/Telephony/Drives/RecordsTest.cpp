@@ -161,7 +161,7 @@ INSTANTIATE_TEST_SUITE_P(
                                             "02 00       // block errors")}),
     [](const auto& each) { return std::string(each.param.name); });
 
-TEST(RecordLayoutTest, secondaryProcessesStandBehindBlocksOf162Bytes) {
+TEST(RecordLayoutTest, secondaryProcessesFollowBlocksOf162Bytes) {
     const Data message =
         harqStatistics(0, {{0, 1, 1, 0}, {1, 1, 1, 0}}, {{4, 0x01020304, 7, 8}}).message(zeroHour());
     // 18 + 162 * 2 = 342, nine bytes each.

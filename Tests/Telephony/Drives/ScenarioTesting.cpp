@@ -81,7 +81,8 @@ std::size_t countOf(const std::map<std::uint32_t, std::vector<Bytes>>& records) 
     return count;
 }
 
-OddMessages oddMessagesOf(const Drive& drive, const RecordCheck& good, const std::set<std::uint32_t>& codes) {
+OddMessages unusualMessagesOf(const Drive& drive, const RecordCheck& good,
+                              const std::set<std::uint32_t>& codes) {
     OddMessages odd;
     for (const ScenarioEvent& event : drive) {
         const auto header = LogMessage::parse(event.message.bytes());
@@ -117,7 +118,7 @@ void expectStampsFollow(const Drive& drive) {
         EXPECT_GE(event.offset, last);
         last = event.offset;
         if (const auto header = LogMessage::parse(event.message.bytes())) {
-            EXPECT_EQ(header->timestamp(), recordTimestamp(DriveScenario::beginning() + event.offset));
+            EXPECT_EQ(header->timestamp(), recordTimestamp(DriveScenario::startTime() + event.offset));
         }
     }
 }

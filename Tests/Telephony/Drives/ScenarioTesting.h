@@ -73,7 +73,7 @@ template <class Entry>
 /// How many records all codes have together.
 [[nodiscard]] std::size_t countOf(const std::map<std::uint32_t, std::vector<Bytes>>& records);
 
-/// The messages of a drive that are odd about their framing, or of a code that has no table.
+/// The messages of a drive with unusual framing, or of a code without a table.
 struct OddMessages {
     int tooShort = 0; ///< five bytes
     int wrongType = 0;
@@ -81,8 +81,8 @@ struct OddMessages {
     int unknownCode = 0;
 };
 /// Expects the prefixed ones to be good records.
-[[nodiscard]] OddMessages oddMessagesOf(const Drive& drive, const RecordCheck& good,
-                                        const std::set<std::uint32_t>& codes);
+[[nodiscard]] OddMessages unusualMessagesOf(const Drive& drive, const RecordCheck& good,
+                                            const std::set<std::uint32_t>& codes);
 
 /// Expects the same offsets and bytes.
 void expectSame(const Drive& again, const Drive& first);

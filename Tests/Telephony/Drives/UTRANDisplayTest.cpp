@@ -80,7 +80,7 @@ TEST_F(UTRANDisplayTest, shownValuesArePlausible) {
     });
 }
 
-TEST_F(UTRANDisplayTest, onlyTheOddMessagesAreReported) {
+TEST_F(UTRANDisplayTest, onlyTheUnusualMessagesAreReported) {
     play<UTRANScenario>(3, 20min, [] {});
     int wrongType = 0;
     std::map<std::string, int> overruns;

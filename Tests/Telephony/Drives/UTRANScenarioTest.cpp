@@ -33,7 +33,7 @@ const Requirements requirements = {
     {0xD00C,
      {17,
       [](Bytes r) {
-          return 289U + 34U * transportChannels(r) + 8U * (r[15] / 16U); // behind the transport channels
+          return 289U + 34U * transportChannels(r) + 8U * (r[15] / 16U); // after the transport channels
       }}},
     {0xD00E, {17, [](Bytes r) { return 17U + 8U * r[16]; }}},
     {0xD0E0, {15, nullptr}},
@@ -79,7 +79,7 @@ TEST(UTRANScenarioTest, aboutTenMessagesComeASecond) {
     expectRate(tenMinutes(), 10min, 7, 16);
 }
 
-TEST(UTRANScenarioTest, recordsAreAsTheirTablesSayButForTheOddOnes) {
+TEST(UTRANScenarioTest, recordsMatchTheirTablesExceptUnusualOnes) {
     const Drive drive = driveOf<UTRANScenario>(1, 30min);
     const RecordCensus census = censusOf(drive, requirements);
     EXPECT_EQ(codesOf(census.good), codes);
@@ -88,14 +88,14 @@ TEST(UTRANScenarioTest, recordsAreAsTheirTablesSayButForTheOddOnes) {
         for (const Bytes record : records)
             EXPECT_EQ(record.size(), requirements.at(code).minimum - 1) << "just one byte short";
     EXPECT_EQ(codesOf(census.overrun), (std::set<std::uint32_t>{0xD00A, 0xD00C, 0xD00E}));
-    // One odd message every ten seconds, a third of them of these two kinds.
+    // One unusual message every ten seconds, a third of them of these two kinds.
     const std::size_t odd = countOf(census.belowMinimum) + countOf(census.overrun);
     EXPECT_GE(odd, 40U);
     EXPECT_LE(odd, 90U);
 }
 
-TEST(UTRANScenarioTest, everyKindOfOddMessageComes) {
-    const OddMessages odd = oddMessagesOf(tenMinutes(), meets(requirements), codes);
+TEST(UTRANScenarioTest, everyKindOfUnusualMessageOccurs) {
+    const OddMessages odd = unusualMessagesOf(tenMinutes(), meets(requirements), codes);
     for (const int count : {odd.tooShort, odd.wrongType, odd.prefixed, odd.unknownCode})
         EXPECT_GE(count, 3);
 }

@@ -45,7 +45,7 @@ protected:
     InterfaceMap modem = testModem(lteAccess);
 };
 
-TEST_F(AskingTest, nothingIsAskedWhileNobodyListens) {
+TEST_F(AskingTest, nothingIsRequestedWithoutAListener) {
     put();
     follow();
     queue.advance(1h);
@@ -68,7 +68,7 @@ TEST_F(AskingTest, nothingIsAskedWhileNobodyListens) {
     listen();
     EXPECT_TRUE(comes([this] { return mock.count("GetCellInfo") == 1; }));
     sink.messages.clear();
-    EXPECT_TRUE(passes([&] { return count(simCode) > 0 && count(contextCode) > 0; })) << "told anew";
+    EXPECT_TRUE(passes([&] { return count(simCode) > 0 && count(contextCode) > 0; })) << "sent again";
 }
 
 TEST_F(AskingTest, cellsAreAskedEveryThreeSecondsAndNeverTwiceAtATime) {
@@ -81,7 +81,7 @@ TEST_F(AskingTest, cellsAreAskedEveryThreeSecondsAndNeverTwiceAtATime) {
         drain();
         EXPECT_EQ(mock.count("GetCellInfo"), turn - 1);
         queue.advance(1ms);
-        ASSERT_TRUE(comes([&] { return count(cellCode) == turn; })) << "each measurement is told";
+        ASSERT_TRUE(comes([&] { return count(cellCode) == turn; })) << "each measurement is sent";
     }
     mock.held = "GetCellInfo";
     queue.advance(3s);
@@ -95,7 +95,7 @@ TEST_F(AskingTest, cellsAreAskedEveryThreeSecondsAndNeverTwiceAtATime) {
     EXPECT_EQ(mock.count("GetLocation"), 0U) << "the serving cell is known";
 }
 
-TEST_F(AskingTest, anAnswerThatComesAfterTheEndIsNobodys) {
+TEST_F(AskingTest, anAnswerAfterTheEndIsIgnored) {
     put();
     follow();
     mock.held = "GetCellInfo";
@@ -120,7 +120,7 @@ TEST_F(AskingTest, theSinkMayStopTheSource) {
     }
 }
 
-TEST_F(AskingTest, whatIsNotSupportedIsToldOnceAndTriedAgainAfterAMinute) {
+TEST_F(AskingTest, anUnsupportedRequestIsReportedOnceAndRetriedAfterAMinute) {
     refuse("GetCellInfo", "org.freedesktop.ModemManager1.Error.Core.Unsupported", "no cells");
     refuse("GetLocation", "org.freedesktop.ModemManager1.Error.Core.Unauthorized", "no place");
     refuse("Setup", "org.freedesktop.ModemManager1.Error.Core.Unsupported", "no levels");
@@ -149,7 +149,7 @@ TEST_F(AskingTest, whatIsNotSupportedIsToldOnceAndTriedAgainAfterAMinute) {
     mock.change(Mock::modemPath(0), Mock::modem, {{"State", 11}});
     EXPECT_TRUE(passes([this] { return count(cellCode) == 1 && rates().size() == 2; }))
         << "another state of the modem is a reason to try";
-    // Over in between, it is told again.
+    // Cleared in between, it is reported again.
     refuse("GetCellInfo", "org.freedesktop.ModemManager1.Error.Core.Unsupported", "no cells");
     EXPECT_TRUE(passes([this] { return warnings().size() == 4; }));
     EXPECT_EQ(latest(cellCode), Value(makeArray())) << "what is not known any more is not shown any more";
@@ -179,7 +179,7 @@ TEST_F(AskingTest, theRateOfTheLevelsIsSetAndPutBack) {
     follow();
     listen();
     ASSERT_TRUE(comes([this] { return rates().size() == 1; }));
-    // ModemManager tells of the new rate, and that is no reason to set it again.
+    // ModemManager signals the new rate, which is no reason to set it again.
     mock.change(Mock::modemPath(0), Mock::signal, {{"Rate", 5U}});
     drain();
     source->stop();
@@ -187,7 +187,7 @@ TEST_F(AskingTest, theRateOfTheLevelsIsSetAndPutBack) {
     EXPECT_THAT(rates(), ElementsAre(5U, 0U));
 }
 
-TEST_F(AskingTest, aSlowerRateOfSomebodyElseIsPutBackAndAFasterOneLeft) {
+TEST_F(AskingTest, aSlowerForeignRateIsRestoredAndAFasterOneKept) {
     modem[Mock::signal] = {{"Rate", 30U}};
     put();
     follow();
@@ -231,7 +231,7 @@ protected:
               "<deny send_interface=\"org.freedesktop.ModemManager1.Modem\" send_member=\"GetCellInfo\"/>") {}
 };
 
-TEST_F(DenyingBusTest, thePlaceStandsInForTheCellsThatMayNotBeAskedFor) {
+TEST_F(DenyingBusTest, theLocationReplacesCellsThatMayNotBeQueried) {
     mock.answers["GetLocation"] = {
         {QVariant::fromValue(LocationMap{{1U, QDBusVariant(QString("001,01,0000,1A2D003,1005"))}})}, {}, {}};
     put();

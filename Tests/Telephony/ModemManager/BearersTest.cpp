@@ -92,16 +92,16 @@ TEST_F(BearersTest, bearersAreShown) {
                  {"Sent", "98765 bytes"}}),
         context({{"Bearer", "7"}, {"State", "Connected"}, {"Type", "Default, attach"}}),
     });
-    EXPECT_TRUE(tells(contextCode, contexts));
+    EXPECT_TRUE(receives(contextCode, contexts));
     EXPECT_EQ(at(display("LTE"), {"Packet Data", "PDP Context Info"}), contexts);
 
     mock.change(Mock::bearerPath(1), Mock::bearer, {{"Connected", true}, {"Interface", "wwan1"}});
     mock.invalidate(Mock::bearerPath(1), Mock::bearer, {"Properties"});
     mock.change(Mock::modemPath(0), Mock::modem, {{"Bearers", paths({Mock::bearerPath(1)})}});
-    EXPECT_TRUE(tells(contextCode,
-                      std::make_shared<Array>(Array{
-                          context({{"Bearer", "1"}, {"State", "Connected"}, {"Interface", "wwan1"}}),
-                          context({{"Bearer", "7"}, {"State", "Connected"}, {"Type", "Default, attach"}})})));
+    EXPECT_TRUE(receives(
+        contextCode, std::make_shared<Array>(Array{
+                         context({{"Bearer", "1"}, {"State", "Connected"}, {"Interface", "wwan1"}}),
+                         context({{"Bearer", "7"}, {"State", "Connected"}, {"Type", "Default, attach"}})})));
 }
 
 TEST_F(BearersTest, aModemWithoutBearersShowsItsLink) {
@@ -121,9 +121,9 @@ TEST_F(BearersTest, aModemWithoutBearersShowsItsLink) {
     for (const auto& [label, text] : {std::pair("LTE RSSI", "-62.0 dBm"), std::pair("LTE RSRP", "-95.3 dBm"),
                                       std::pair("LTE RSRQ", "-10.5 dB"), std::pair("LTE SNR", "13.0 dB")})
         link.asDictionary()->set(label, text);
-    ASSERT_TRUE(tells(contextCode, std::make_shared<Array>(Array{link})));
+    ASSERT_TRUE(receives(contextCode, std::make_shared<Array>(Array{link})));
 
-    // Levels change often; they are told together.
+    // Levels change often; they are reported together.
     const std::size_t before = count(contextCode);
     for (int i = 0; i < 50; ++i)
         mock.change(Mock::modemPath(0), Mock::signal, {{"Lte", QVariantMap{{"rsrp", -100.0 - i * 0.1}}}});
@@ -132,7 +132,7 @@ TEST_F(BearersTest, aModemWithoutBearersShowsItsLink) {
     EXPECT_EQ(count(contextCode), before + 1);
     EXPECT_EQ(at(latest(contextCode), {"0", "LTE RSRP"}), Value("-104.9 dBm"));
     mock.removeInterface(Mock::modemPath(0), Mock::signal);
-    EXPECT_TRUE(tells(contextCode, std::make_shared<Array>(Array{context({{"Bearer", "None"}})})));
+    EXPECT_TRUE(receives(contextCode, std::make_shared<Array>(Array{context({{"Bearer", "None"}})})));
 }
 
 TEST_F(BearersTest, absurdLinksAndBearersAreLeftOut) {
@@ -169,8 +169,8 @@ TEST_F(BearersTest, absurdLinksAndBearersAreLeftOut) {
     mock.put(Mock::modemPath(0), modem);
     follow();
     listen();
-    EXPECT_TRUE(tells(contextCode, std::make_shared<Array>(
-                                       Array{dictionary({{"Bearer", "0"}, {"Access Technology", "LTE"}})})));
+    EXPECT_TRUE(receives(contextCode, std::make_shared<Array>(Array{
+                                          dictionary({{"Bearer", "0"}, {"Access Technology", "LTE"}})})));
 }
 
 TEST_F(BearersTest, manyBearersAreCut) {

@@ -14,7 +14,7 @@ namespace velmora {
 
 class CellsFixture : public ModemManagerTest {
 protected:
-    void tellCells(const CellList& cells) {
+    void setCells(const CellList& cells) {
         mock.answers["GetCellInfo"] = {{QVariant::fromValue(cells)}, {}, {}};
     }
     void putModem(uint access) { mock.put(Mock::modemPath(0), testModem(access)); }

@@ -17,7 +17,7 @@ using CellsTest = CellsFixture;
 
 TEST_F(CellsTest, gsm) {
     putModem(gsmAccess);
-    tellCells({
+    setCells({
         {{"cell-type", 2U},
          {"serving", true},
          {"operator-id", "21034"},
@@ -65,7 +65,7 @@ TEST_F(CellsTest, gsm) {
 
 TEST_F(CellsTest, umts) {
     putModem(umtsAccess);
-    tellCells({
+    setCells({
         {{"cell-type", 3U},
          {"serving", true},
          {"operator-id", "310260"},
@@ -116,8 +116,8 @@ TEST_F(CellsTest, umts) {
 
 TEST_F(CellsTest, lte) {
     putModem(lteAccess);
-    tellCells({
-        // Another technology's cell does not stand in the way of the serving one.
+    setCells({
+        // Another technology's cell does not hide the serving one.
         {{"cell-type", 6U}, {"serving", true}, {"tac", "7"}, {"ci", "123456789"}, {"nrarfcn", 431000U}},
         {{"cell-type", 5U},
          {"serving", true},
@@ -161,7 +161,7 @@ TEST_F(CellsTest, lte) {
 TEST_F(CellsTest, absurdAndMissingMembersAreLeftOut) {
     putModem(umtsAccess);
     const double notANumber = std::numeric_limits<double>::quiet_NaN();
-    tellCells({
+    setCells({
         {{"cell-type", 3U}, {"serving", false}}, // nothing but what is always there
         {{"cell-type", 3U},
          {"serving", false},
@@ -234,7 +234,7 @@ TEST_F(CellsTest, anAnswerOfAnotherTypeIsNoCell) {
         ASSERT_TRUE(passes([&] { return mock.count("GetCellInfo") >= before + 2; }));
     }
     EXPECT_EQ(count(cellCode), 0U);
-    tellCells({{{"cell-type", 5U}, {"serving", true}, {"tac", "7"}}});
+    setCells({{{"cell-type", 5U}, {"serving", true}, {"tac", "7"}}});
     ASSERT_TRUE(passes([&] { return count(cellCode) > 0; }));
     EXPECT_EQ(at(latest(cellCode), {"0", "kVoxCellMonitorTAC"}), Value(7));
 }
@@ -244,7 +244,7 @@ TEST_F(CellsTest, manyCellsAreCut) {
     CellList many;
     for (uint i = 0; i < 5000; ++i)
         many.push_back({{"cell-type", 5U}, {"serving", i == 0}, {"earfcn", i}});
-    tellCells(many);
+    setCells(many);
     follow();
     listen();
     EXPECT_EQ(cells().asArray()->size(), 64U);
@@ -254,8 +254,8 @@ TEST_F(CellsTest, theServingCellsLevelsComeFromTheSignalWhereItHasNone) {
     InterfaceMap modem = testModem(umtsAccess);
     modem[Mock::signal] = {{"Rate", 5U}, {"Umts", QVariantMap{{"rscp", -88.6}, {"ecio", -9.0}}}};
     mock.put(Mock::modemPath(0), modem);
-    tellCells({{{"cell-type", 3U}, {"serving", true}, {"psc", 7U}, {"ecio", -3.0}},
-               {{"cell-type", 3U}, {"serving", false}, {"psc", 8U}}});
+    setCells({{{"cell-type", 3U}, {"serving", true}, {"psc", 7U}, {"ecio", -3.0}},
+              {{"cell-type", 3U}, {"serving", false}, {"psc", 8U}}});
     follow();
     listen();
     constexpr auto kind = kVoxCellMonitorRadioAccessTechnologyUMTS;

@@ -19,10 +19,10 @@ namespace velmora {
 namespace {
 
 bool setsKey(const MemberRow& row) {
-    return row.use != MemberUse::Service && row.use != MemberUse::Nothing;
+    return row.use != MemberUse::Service && row.use != MemberUse::Unused;
 }
 
-TEST(MemberTableTest, everyRowIsWhole) {
+TEST(MemberTableTest, everyRowIsComplete) {
     for (const MemberRow& row : memberTable()) {
         EXPECT_FALSE(row.member.empty());
         EXPECT_FALSE(row.note.empty()) << row.member << ": units, or why it is unused";
@@ -34,7 +34,7 @@ TEST(MemberTableTest, everyRowIsWhole) {
     }
 }
 
-TEST(MemberTableTest, noKeyOfARecordIsFedTwice) {
+TEST(MemberTableTest, noKeyOfARecordIsSetTwice) {
     // A bearer's dictionary holds its own values and the link's.
     std::set<std::string_view> bearer;
     std::set<std::string_view> files;
@@ -51,7 +51,7 @@ TEST(MemberTableTest, noKeyOfARecordIsFedTwice) {
     }
 }
 
-TEST(MemberTableTest, credentialsAreNeverFed) {
+TEST(MemberTableTest, credentialsAreNeverUsed) {
     Dictionary target;
     setKeys(target, MemberUse::Bearer, MemberOf::BearerProperties,
             Dictionary{{"user", "me"}, {"password", "secret"}, {"apn", "a.test"}});
@@ -61,7 +61,7 @@ TEST(MemberTableTest, credentialsAreNeverFed) {
     EXPECT_EQ(target.size(), 1U);
 }
 
-/// A conversion, what it is given and what it gives.
+/// A conversion, its argument and its result.
 struct Case {
     Value (*convert)(const Value&);
     Value given;

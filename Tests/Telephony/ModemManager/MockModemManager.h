@@ -71,13 +71,13 @@ public:
     void vanish();
     void appear();
 
-    /// Objects that are put before anybody follows are just there; later ones are signalled as added.
+    /// Objects that exist before the first client are not signalled; later ones are signalled as added.
     void put(const QString& path, const InterfaceMap& interfaces);
     void remove(const QString& path);
     void removeInterface(const QString& path, const QString& interface);
     /// Changes properties and signals that.
     void change(const QString& path, const QString& interface, const QVariantMap& changed);
-    /// A property's value is no longer told.
+    /// A property's value is invalidated.
     void invalidate(const QString& path, const QString& interface, const QStringList& names);
     void emitSignal(const QString& path, const QString& interface, const QString& member,
                     const QVariantList& arguments);

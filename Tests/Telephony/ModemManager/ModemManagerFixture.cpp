@@ -26,7 +26,7 @@ ModemManagerTest::~ModemManagerTest() {
 
 void ModemManagerTest::follow(std::optional<std::uint32_t> modem) {
     source = std::make_unique<ModemManagerSource>(queue, clock, ModemFollower::Options{modem, bus.address()});
-    source->whenTechnologyChanges([this] { ++changes; });
+    source->setTechnologyCallback([this] { ++changes; });
     ASSERT_TRUE(comes([this] { return mock.count("GetManagedObjects") > 0; }));
     drain();
 }

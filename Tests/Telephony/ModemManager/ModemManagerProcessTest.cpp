@@ -127,7 +127,7 @@ TEST_F(ModemManagerProcessTest, aChangedTechnologyEndsTheChannelAndTheNextOneIsO
                                                                    " Energy Per Chip -7 dB\n"));
 }
 
-TEST_F(ModemManagerProcessTest, aClientThatComesBeforeTheModemIsNotToldATechnology) {
+TEST_F(ModemManagerProcessTest, aClientBeforeTheModemGetsNoTechnology) {
     serve("modemmanager", "<4>modemmanager: no modem is there");
     TestClient client(directory.path(), "com.velmora.test.client");
     ASSERT_TRUE(client.connect());

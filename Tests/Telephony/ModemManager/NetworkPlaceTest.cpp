@@ -3,7 +3,7 @@
 
 #include "Tests/Telephony/ModemManager/CellsFixture.h"
 
-/// The place in the network that stands in for missing cells, from the bus to what a decoder shows.
+/// The location in the network that replaces missing cells, from the bus to a decoder's display.
 
 namespace velmora {
 namespace {

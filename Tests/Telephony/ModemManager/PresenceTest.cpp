@@ -29,7 +29,7 @@ protected:
     inline static const QVariantMap withoutSIM = {{"Sim", QVariant::fromValue(QDBusObjectPath("/"))}};
 };
 
-TEST_F(PresenceTest, noModemIsToldOnceAndHasNoTechnology) {
+TEST_F(PresenceTest, aMissingModemIsReportedOnceAndHasNoTechnology) {
     follow();
     EXPECT_EQ(source->technology(), "");
     listen();
@@ -199,7 +199,7 @@ INSTANTIATE_TEST_SUITE_P(
                       Technology{"evdo", 1U << 12, 1U << 1, ""}, Technology{"nothing", 0, 0, ""}),
     [](const auto& test) { return std::string(test.param.name); });
 
-TEST_F(PresenceTest, aChangedTechnologyIsTold) {
+TEST_F(PresenceTest, aChangedTechnologyIsReported) {
     mock.put(Mock::modemPath(0), testModem(lteAccess));
     follow();
     EXPECT_EQ(changes, 1);

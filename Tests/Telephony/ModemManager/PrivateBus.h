@@ -11,7 +11,7 @@
 
 namespace velmora {
 
-/// A message bus of the test's own, as a process. It starts no services and lets everybody own any name.
+/// A message bus of the test's own, as a process. It starts no services and lets every client own any name.
 class PrivateBus {
 public:
     /// `rules` are policy rules in the form of the bus's configuration, after the one that allows everything.

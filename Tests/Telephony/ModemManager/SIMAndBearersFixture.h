@@ -26,7 +26,7 @@ protected:
             list.push_back(QDBusObjectPath(text));
         return QVariant::fromValue(list);
     }
-    [[nodiscard]] bool tells(std::uint16_t code, const Value& list) {
+    [[nodiscard]] bool receives(std::uint16_t code, const Value& list) {
         return passes([&] { return latest(code) == list; });
     }
 };

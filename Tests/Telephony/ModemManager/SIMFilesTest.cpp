@@ -28,19 +28,19 @@ TEST_F(SIMFilesTest, theSIMsFilesAreShown) {
     putModem({{"OwnNumbers", QStringList{"+15550100", "+15550101"}}});
     follow();
     listen();
-    EXPECT_TRUE(
-        tells(simCode, dictionary({{"kSimFile_ICCID", "89011010000000000017"},
-                                   {"kSimFile_AHPLMN", "001-01"},
-                                   {"kSimFile_PNN", "Test Network"},
-                                   {"kSimFile_OPLMNAcT", "001-02 (LTE), 310-260 (GSM, GPRS, UMTS), 999-99"},
-                                   {"kSimFile_MSISDN", "+15550100, +15550101"}})));
+    EXPECT_TRUE(receives(simCode,
+                         dictionary({{"kSimFile_ICCID", "89011010000000000017"},
+                                     {"kSimFile_AHPLMN", "001-01"},
+                                     {"kSimFile_PNN", "Test Network"},
+                                     {"kSimFile_OPLMNAcT", "001-02 (LTE), 310-260 (GSM, GPRS, UMTS), 999-99"},
+                                     {"kSimFile_MSISDN", "+15550100, +15550101"}})));
     EXPECT_EQ(at(display("LTE"), {"SIM Info"}),
               dictionary({{"EF-ICCID", "89011010000000000017"},
                           {"EF-MSISDN", "+15550100, +15550101"},
                           {"EF-ACTING HPLMN", "001-01"},
                           {"EF-PLMN NETWORK NAME", "Test Network"},
                           {"EF-OPLMNAcT", "001-02 (LTE), 310-260 (GSM, GPRS, UMTS), 999-99"}}));
-    // What does not change is not told again.
+    // What does not change is not reported again.
     queue.advance(10min);
     drain();
     EXPECT_EQ(count(simCode), 1U);
@@ -75,7 +75,7 @@ TEST_F(SIMFilesTest, absurdFilesAreLeftOut) {
         putModem({{"OwnNumbers", QStringList("+1")}});
         follow();
         listen();
-        EXPECT_TRUE(tells(simCode, dictionary({{"kSimFile_MSISDN", "+1"}}))) << each.typeName();
+        EXPECT_TRUE(receives(simCode, dictionary({{"kSimFile_MSISDN", "+1"}}))) << each.typeName();
         sink.messages.clear();
         source->stop();
     }
@@ -92,7 +92,7 @@ TEST_F(SIMFilesTest, absurdFilesAreLeftOut) {
     }
 }
 
-TEST_F(SIMFilesTest, partsThatCannotBeReadAreToldOnceAndTriedAgain) {
+TEST_F(SIMFilesTest, unreadablePartsAreReportedOnceAndRetried) {
     mock.answers["GetAll"] = {{}, "org.freedesktop.DBus.Error.AccessDenied", "hands off"};
     putModem({{"Bearers", paths({Mock::bearerPath(0)})}});
     mock.put(Mock::bearerPath(0), {{Mock::bearer, {{"Connected", true}}}});

@@ -29,7 +29,7 @@ protected:
         std::filesystem::create_directory(path("out"));
     }
 
-    /// Runs `velmora-log convert` and gives its own words; its exit status has to be the one given.
+    /// Runs `velmora-log convert` and returns its messages; checks its exit status.
     std::string convert(std::vector<std::string> arguments, int status,
                         std::optional<std::string> input = std::nullopt) {
         arguments.insert(arguments.begin(), "convert");
@@ -38,7 +38,7 @@ protected:
         ToolProcess process(setup);
         EXPECT_EQ(process.exitStatus(), status) << process.errors();
         EXPECT_EQ(process.output(), "");
-        return ownWords(process.errors());
+        return ownMessages(process.errors());
     }
     /// What is in the directory that the tests write to.
     [[nodiscard]] std::vector<std::string> outputs() const {
@@ -147,7 +147,7 @@ TEST_F(ConvertCommandTest, OutputWithoutAFormIsAUsageError) {
         EXPECT_EQ(convert({path("drive.pcapng"), out}, 2),
                   "velmora-log: OUT: got " + out +
                       ", wanted a name that ends in .pcapng, .velmora or .dlf\n"
-                      "velmora-log --help tells more\n");
+                      "see velmora-log --help\n");
 }
 
 TEST_F(ConvertCommandTest, FileThatIsThereIsKeptUnlessForced) {
@@ -174,12 +174,12 @@ TEST_F(ConvertCommandTest, InputIsNeverTheOutput) {
                             VELMORA_BUILD_DIR "/velmora-log", path("drive.pcapng")}),
                       "/bin/sh");
     EXPECT_EQ(piped.exitStatus(), 1);
-    EXPECT_EQ(ownWords(piped.errors()),
+    EXPECT_EQ(ownMessages(piped.errors()),
               "velmora-log: " + path("drive.pcapng") + " is the input, wanted another file\n");
     EXPECT_EQ(contentOf("drive.pcapng"), before);
 }
 
-TEST_F(ConvertCommandTest, OutputThatIsNoFileIsLeftAlone) {
+TEST_F(ConvertCommandTest, NonFileOutputIsNotReplaced) {
     std::filesystem::create_directory(path("out/drive.dlf"));
     EXPECT_EQ(convert({"--force", path("drive.pcapng"), path("out/drive.dlf")}, 1),
               "velmora-log: " + path("out/drive.dlf") + " is no regular file\n");
@@ -188,7 +188,7 @@ TEST_F(ConvertCommandTest, OutputThatIsNoFileIsLeftAlone) {
                   ": cannot be opened for writing: No such file or directory\n");
 }
 
-TEST_F(ConvertCommandTest, LossIsToldAndTheRestConverted) {
+TEST_F(ConvertCommandTest, LossIsReportedAndTheRestConverted) {
     std::filesystem::resize_file(path("drive.pcapng"), std::filesystem::file_size(path("drive.pcapng")) - 6);
     for (const std::string form : {".pcapng", ".velmora", ".dlf"}) {
         const std::string words = convert({path("drive.pcapng"), path("out/drive" + form)}, 1);
@@ -199,7 +199,7 @@ TEST_F(ConvertCommandTest, LossIsToldAndTheRestConverted) {
     }
 }
 
-TEST_F(ConvertCommandTest, WhatADLFLogCannotHoldIsToldAndTheRestConverted) {
+TEST_F(ConvertCommandTest, UnrepresentableMessagesAreReportedAndTheRestConverted) {
     const auto offsets = writeRecording("odd.pcapng", "Ostrel_GSM",
                                         {{at(0), rrState(4)}, {at(1), hex("01 02 03")}, {at(2), rrState(5)}});
     EXPECT_EQ(convert({path("odd.pcapng"), path("out/odd.dlf")}, 1),
@@ -208,7 +208,7 @@ TEST_F(ConvertCommandTest, WhatADLFLogCannotHoldIsToldAndTheRestConverted) {
     EXPECT_THAT(messagesOf("out/odd.dlf"), ElementsAre(rrState(4), rrState(5)));
 }
 
-TEST_F(ConvertCommandTest, MessagesLeftOutAreToldUpToAHundred) {
+TEST_F(ConvertCommandTest, SkippedMessagesAreReportedUpToAHundred) {
     std::vector<TimedMessage> messages(103, {at(0), hex("01")});
     messages.push_back({at(1), rrState(5)});
     writeRecording("odd.pcapng", "Ostrel_GSM", messages);
@@ -265,7 +265,7 @@ TEST_F(ConvertCommandTest, FailureToWriteLeavesWhatWasThere) {
                                   (VELMORA_BUILD_DIR "/velmora-log"), path("drive.pcapng"), out}),
                             "/bin/sh");
         EXPECT_EQ(process.exitStatus(), 1);
-        EXPECT_EQ(ownWords(process.errors()),
+        EXPECT_EQ(ownMessages(process.errors()),
                   form == ".velmora" ? "velmora-log: " + out + ": cannot be written: File too large\n"
                                      : "velmora-log: cannot write " + out + ": File too large\n");
     }
@@ -283,13 +283,13 @@ TEST_F(ConvertCommandTest, InterruptedConversionLeavesNothing) {
     // Nothing but time makes the test's event loop look again.
     LoopTimer look([] {});
     look.startRepeating(std::chrono::milliseconds(20));
-    ASSERT_TRUE(eventually([&] { return !outputs().empty(); })) << "the draft";
+    ASSERT_TRUE(eventually([&] { return !outputs().empty(); })) << "the temporary file";
     process.signal(SIGTERM);
     EXPECT_EQ(process.exitStatus(), 128 + SIGTERM);
     EXPECT_THAT(outputs(), ElementsAre());
 }
 
-TEST_F(ConvertCommandTest, FileThatIsNotThereIsTold) {
+TEST_F(ConvertCommandTest, MissingFileIsReported) {
     EXPECT_EQ(convert({path("gone.pcapng"), path("out/gone.dlf")}, 1),
               "velmora-log: " + path("gone.pcapng") + ": cannot open: No such file or directory\n");
     EXPECT_THAT(outputs(), ElementsAre());

@@ -51,7 +51,7 @@ TEST_F(DecodeCommandTest, TextIsTheDisplayTreeAfterTheLastMessage) {
     ToolProcess process(tool({"decode", path("drive.pcapng")}));
     EXPECT_EQ(process.exitStatus(), 0);
     EXPECT_EQ(process.output(), idleText);
-    EXPECT_EQ(ownWords(process.errors()), "");
+    EXPECT_EQ(ownMessages(process.errors()), "");
 }
 
 TEST_F(DecodeCommandTest, JsonIsOneObjectAndNothingElse) {
@@ -137,7 +137,7 @@ TEST_F(DecodeCommandTest, RecordingWithoutMessagesHasAnEmptyDisplay) {
     EXPECT_EQ(text.output(), "");
 }
 
-TEST_F(DecodeCommandTest, TechnologyGoesBeforeTheOneThatTheFileNames) {
+TEST_F(DecodeCommandTest, TechnologyOptionOverridesTheFile) {
     writeRecording("a.pcapng", "Nonesuch", {{at(0), rrState(4)}, {at(0), rrState(5)}});
     for (const char* name : {"Ostrel_GSM", "kVoxLogChannelTechnology_Ostrel_GSM"}) {
         ToolProcess process(tool({"decode", "--format", "json", "--technology", name, path("a.pcapng")}));
@@ -146,7 +146,7 @@ TEST_F(DecodeCommandTest, TechnologyGoesBeforeTheOneThatTheFileNames) {
     }
 }
 
-TEST_F(DecodeCommandTest, UnknownOrMissingTechnologyIsToldWithThoseThatThereAre) {
+TEST_F(DecodeCommandTest, UnknownOrMissingTechnologyIsReportedWithTheValidOnes) {
     constexpr const char* names = "wanted one of IFX, Ostrel_GSM, Ostrel_CDMA, Ostrel_LTE, Ostrel_UTRAN2";
     writeRecording("none.pcapng", "", {{at(0), rrState(5)}});
     writeRecording("other.pcapng", "Nonesuch", {{at(0), rrState(5)}});
@@ -166,7 +166,7 @@ TEST_F(DecodeCommandTest, UnknownOrMissingTechnologyIsToldWithThoseThatThereAre)
         ToolProcess process(tool(row.arguments));
         EXPECT_EQ(process.exitStatus(), 1);
         EXPECT_EQ(process.output(), "");
-        EXPECT_EQ(ownWords(process.errors()), "velmora-log: " + row.message + "\n");
+        EXPECT_EQ(ownMessages(process.errors()), "velmora-log: " + row.message + "\n");
     }
 }
 
@@ -175,7 +175,7 @@ TEST_F(DecodeCommandTest, FileThatIsNotThereDoesNotKeepTheOthersFromBeingDecoded
     ToolProcess process(tool({"decode", "--format", "json", path("gone.pcapng"), path("drive.pcapng")}));
     EXPECT_EQ(process.exitStatus(), 1);
     EXPECT_EQ(process.output(), idleJson);
-    EXPECT_EQ(ownWords(process.errors()),
+    EXPECT_EQ(ownMessages(process.errors()),
               "velmora-log: " + path("gone.pcapng") + ": cannot open: No such file or directory\n");
 }
 
@@ -185,11 +185,11 @@ TEST_F(DecodeCommandTest, FileThatIsNoRecordingIsRefused) {
     ToolProcess process(setup);
     EXPECT_EQ(process.exitStatus(), 1);
     EXPECT_EQ(process.output(), "");
-    EXPECT_EQ(ownWords(process.errors()),
+    EXPECT_EQ(ownMessages(process.errors()),
               "velmora-log: standard input: empty, wanted a recording, a snapshot or a DLF log\n");
 }
 
-TEST_F(DecodeCommandTest, TemplateThatCannotBeReadIsTold) {
+TEST_F(DecodeCommandTest, UnreadableTemplateIsReported) {
     writeDrive("drive.pcapng");
     const std::string place = path("resources/Ostrel_GSM.plist");
     std::filesystem::remove(place);
@@ -197,9 +197,9 @@ TEST_F(DecodeCommandTest, TemplateThatCannotBeReadIsTold) {
     ToolProcess process(tool({"decode", path("drive.pcapng")}));
     EXPECT_EQ(process.exitStatus(), 1);
     EXPECT_EQ(process.output(), "");
-    EXPECT_EQ(ownWords(process.errors()), "velmora-log: " + path("drive.pcapng") +
-                                              ": decoded without its template: " + place +
-                                              ": cannot be read: Is a directory\n");
+    EXPECT_EQ(ownMessages(process.errors()), "velmora-log: " + path("drive.pcapng") +
+                                                 ": decoded without its template: " + place +
+                                                 ": cannot be read: Is a directory\n");
 }
 
 TEST_F(DecodeCommandTest, RecordingCutOffIsDecodedUpToThere) {
@@ -210,10 +210,10 @@ TEST_F(DecodeCommandTest, RecordingCutOffIsDecodedUpToThere) {
     EXPECT_EQ(process.exitStatus(), 1);
     EXPECT_EQ(process.output(), idleJson);
     const std::uint64_t length = offsets[3] - offsets[2];
-    EXPECT_EQ(ownWords(process.errors()), "velmora-log: " + path("cut.pcapng") + ": record 3 at offset " +
-                                              std::to_string(offsets[2]) + ": block cut off after " +
-                                              std::to_string(length - 10) + " of " + std::to_string(length) +
-                                              " bytes\n");
+    EXPECT_EQ(ownMessages(process.errors()), "velmora-log: " + path("cut.pcapng") + ": record 3 at offset " +
+                                                 std::to_string(offsets[2]) + ": block cut off after " +
+                                                 std::to_string(length - 10) + " of " +
+                                                 std::to_string(length) + " bytes\n");
 }
 
 TEST_F(DecodeCommandTest, RecordsThatDecodersDropAreNoBadInput) {
@@ -226,7 +226,7 @@ TEST_F(DecodeCommandTest, RecordsThatDecodersDropAreNoBadInput) {
     EXPECT_THAT(process.errors(), HasSubstr("<3>Invalid log type: 2. Dropping.\n"));
 }
 
-TEST_F(DecodeCommandTest, UnreadableSimFilesEndTheProgramInTheirWords) {
+TEST_F(DecodeCommandTest, UnreadableSimFilesEndTheProgramWithTheirMessage) {
     const std::vector<std::uint64_t> offsets = writeRecording(
         "sim.pcapng", "Ostrel_GSM",
         {{at(0), rrState(5)}, {at(1), record(0x0000, "DE AD BE EF", 0xFF)}, {at(2), rrState(4)}});
@@ -234,18 +234,18 @@ TEST_F(DecodeCommandTest, UnreadableSimFilesEndTheProgramInTheirWords) {
     ToolProcess process(tool({"decode", path("drive.pcapng"), path("sim.pcapng")}));
     EXPECT_EQ(process.exitStatus(), 1);
     EXPECT_EQ(process.output(), "== " + path("drive.pcapng") + " ==\n" + idleText);
-    EXPECT_EQ(ownWords(process.errors()), "velmora-log: " + path("sim.pcapng") + ": record 2 at offset " +
-                                              std::to_string(offsets[1]) +
-                                              ": SIM File dictionary data could not be constructed\n");
+    EXPECT_EQ(ownMessages(process.errors()), "velmora-log: " + path("sim.pcapng") + ": record 2 at offset " +
+                                                 std::to_string(offsets[1]) +
+                                                 ": SIM File dictionary data could not be constructed\n");
 }
 
-TEST_F(DecodeCommandTest, UnreadableSerializedObjectEndsTheProgramInItsWords) {
+TEST_F(DecodeCommandTest, UnreadableSerializedObjectEndsTheProgramWithItsMessage) {
     const std::vector<std::uint64_t> offsets =
         writeRecording("ifx.pcapng", "IFX", {{at(0), hex("00 01 02 03")}});
     ToolProcess process(tool({"decode", path("ifx.pcapng")}));
     EXPECT_EQ(process.exitStatus(), 1);
     EXPECT_EQ(process.output(), "");
-    EXPECT_THAT(ownWords(process.errors()),
+    EXPECT_THAT(ownMessages(process.errors()),
                 testing::StartsWith("velmora-log: " + path("ifx.pcapng") + ": record 1 at offset " +
                                     std::to_string(offsets[0]) + ": "));
 }
@@ -259,26 +259,27 @@ TEST_F(DecodeCommandTest, ClosedPipeEndsItQuietly) {
     ToolProcess process(tool({"decode", path("long.pcapng"), path("long.pcapng")}));
     process.stopReading();
     EXPECT_EQ(process.exitStatus(), 0);
-    EXPECT_EQ(ownWords(process.errors()), "");
+    EXPECT_EQ(ownMessages(process.errors()), "");
 }
 
-TEST_F(DecodeCommandTest, FullDiskIsTold) {
+TEST_F(DecodeCommandTest, FullDiskIsReported) {
     writeDrive("drive.pcapng");
     ToolProcess::Setup setup = tool({"decode", path("drive.pcapng")});
     setup.outputFile = "/dev/full";
     ToolProcess process(setup);
     EXPECT_EQ(process.exitStatus(), 1);
-    EXPECT_EQ(ownWords(process.errors()),
+    EXPECT_EQ(ownMessages(process.errors()),
               "velmora-log: cannot write standard output: No space left on device\n");
 }
 
-TEST_F(DecodeCommandTest, ClosedStandardOutputIsTold) {
+TEST_F(DecodeCommandTest, ClosedStandardOutputIsReported) {
     writeDrive("drive.pcapng");
     ToolProcess process(
         tool({"-c", "exec \"$0\" decode \"$1\" >&-", VELMORA_BUILD_DIR "/velmora-log", path("drive.pcapng")}),
         "/bin/sh");
     EXPECT_EQ(process.exitStatus(), 1);
-    EXPECT_EQ(ownWords(process.errors()), "velmora-log: cannot write standard output: Bad file descriptor\n");
+    EXPECT_EQ(ownMessages(process.errors()),
+              "velmora-log: cannot write standard output: Bad file descriptor\n");
 }
 
 TEST_F(DecodeCommandTest, LogLevelDecidesWhichLinesAreWritten) {

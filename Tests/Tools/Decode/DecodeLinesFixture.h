@@ -29,7 +29,7 @@ protected:
         arguments.insert(arguments.begin(), "decode");
         ToolProcess process(tool(std::move(arguments)));
         EXPECT_EQ(process.exitStatus(), 0);
-        EXPECT_EQ(ownWords(process.errors()), "");
+        EXPECT_EQ(ownMessages(process.errors()), "");
         return process.output();
     }
 };

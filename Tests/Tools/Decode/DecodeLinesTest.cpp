@@ -93,7 +93,7 @@ TEST_F(DecodeLinesTest, SelectionRestrictsEveryFormat) {
     EXPECT_EQ(decode({"--select", "/Nothing", path("a.pcapng")}), "");
 }
 
-TEST_F(DecodeLinesTest, LinesBeforeAFailureOfTheDecoderAreWhole) {
+TEST_F(DecodeLinesTest, LinesBeforeADecoderFailureAreComplete) {
     const std::vector<std::uint64_t> offsets = writeRecording(
         "sim.pcapng", "Ostrel_GSM", {{at(0), rrState(5)}, {at(1), record(0x0000, "DE AD BE EF", 0xFF)}});
     ToolProcess process(tool({"decode", "--format", "jsonl", "--every", "message", path("sim.pcapng")}));
@@ -102,9 +102,9 @@ TEST_F(DecodeLinesTest, LinesBeforeAFailureOfTheDecoderAreWhole) {
               R"({"time":"2026-11-16T05:00:00.000000000Z","code":20780,"sections":{"GSM RR Info":{)"
               R"("RR State":"RR_IDLE","RR Sub State":"0","RR Status":"1","RR Mode":"Voice"}}})"
               "\n");
-    EXPECT_EQ(ownWords(process.errors()), "velmora-log: " + path("sim.pcapng") + ": record 2 at offset " +
-                                              std::to_string(offsets[1]) +
-                                              ": SIM File dictionary data could not be constructed\n");
+    EXPECT_EQ(ownMessages(process.errors()), "velmora-log: " + path("sim.pcapng") + ": record 2 at offset " +
+                                                 std::to_string(offsets[1]) +
+                                                 ": SIM File dictionary data could not be constructed\n");
 }
 
 TEST_F(DecodeLinesTest, LinesOfAPipeComeWithEachRefresh) {
@@ -119,7 +119,7 @@ TEST_F(DecodeLinesTest, LinesOfAPipeComeWithEachRefresh) {
     EXPECT_EQ(process.output(), std::string("{") + firstRefresh + "\n{" + secondRefresh + "\n");
 }
 
-TEST_F(DecodeLinesTest, FullDiskIsTold) {
+TEST_F(DecodeLinesTest, FullDiskIsReported) {
     writeDrive("a.pcapng");
     for (const std::vector<std::string>& format :
          {std::vector<std::string>{"--format", "jsonl"}, {"--format", "csv", "--select", "/SIM Info"}}) {
@@ -129,7 +129,7 @@ TEST_F(DecodeLinesTest, FullDiskIsTold) {
         setup.outputFile = "/dev/full";
         ToolProcess process(setup);
         EXPECT_EQ(process.exitStatus(), 1);
-        EXPECT_EQ(ownWords(process.errors()),
+        EXPECT_EQ(ownMessages(process.errors()),
                   "velmora-log: cannot write standard output: No space left on device\n");
     }
 }
@@ -143,7 +143,7 @@ TEST_F(DecodeLinesTest, ClosedPipeEndsItEarlyAndQuietly) {
         ASSERT_TRUE(process.waitFor("\n"));
         process.stopReading();
         EXPECT_EQ(process.exitStatus(), 0);
-        EXPECT_EQ(ownWords(process.errors()), "");
+        EXPECT_EQ(ownMessages(process.errors()), "");
     }
 }
 

@@ -27,7 +27,7 @@ TEST(DecodeProgressTest, ShowsPercentRateAndTimeLeft) {
     std::vector<std::string> lines;
     DecodeProgress progress(1000 * mebibyte, clock, [&](std::string_view line) { lines.emplace_back(line); });
     clock.advance(500ms);
-    progress.at(mebibyte - 1); // too near for a look at the clock
+    progress.at(mebibyte - 1); // too near to read the clock
     progress.at(50 * mebibyte);
     clock.advance(100ms);
     progress.at(60 * mebibyte); // too soon
@@ -65,7 +65,7 @@ TEST(DecodeProgressTest, OnlyFilesHaveASize) {
 
 class DecodeProgressProgramTest : public ToolTest {
 protected:
-    /// So many MiB of messages that no section wants.
+    /// This many MiB of messages without subscriber.
     void writeLargeRecording(const std::string& name, std::size_t mebibytes) const {
         const Data message(std::vector<std::uint8_t>(std::size_t{1} << 20, 0x01));
         writeRecording(name, "Ostrel_GSM", std::vector<TimedMessage>(mebibytes, {at(0), message}));

@@ -25,7 +25,7 @@ using testing::IsEmpty;
 /// Messages that the test has made, numbered from 1.
 class ListReader final : public MessageReader {
 public:
-    /// The refreshes that the file tells of, by the number of the message before.
+    /// The refreshes recorded in the file, by the number of the preceding message.
     std::map<std::uint64_t, Time> refreshes;
 
     ListReader(std::string technology, const std::vector<TimedMessage>& messages)
@@ -68,12 +68,12 @@ protected:
     };
 
     struct Observer final : DecodingObserver {
-        void messageDecoded(const LoggedMessage&, LogGenerator&, Dictionary&) override { ++messages; }
-        void refreshed(Time tick, const Decoded& decoded) override {
+        void didDecode(const LoggedMessage&, LogGenerator&, Dictionary&) override { ++messages; }
+        void didRefresh(Time tick, const Decoded& decoded) override {
             const Dictionary* section = (*decoded.display.asDictionary())["GSM RR Info"].asDictionary();
             refreshes.push_back({tick, *(*section)["RR State"].asString()});
         }
-        [[nodiscard]] bool hasEnough() const override { return messages >= mostMessages; }
+        [[nodiscard]] bool isDone() const override { return messages >= mostMessages; }
 
         std::uint64_t mostMessages = std::numeric_limits<std::uint64_t>::max();
         std::uint64_t messages = 0;
@@ -85,7 +85,7 @@ protected:
                                             const TimeRange& range = {}) {
         return refreshesOf(messages, {}, range);
     }
-    /// As above, where the file tells of refreshes: by the number of the message before.
+    /// As above, where the file records refreshes: by the number of the preceding message.
     static std::vector<Refresh> refreshesOf(const std::vector<TimedMessage>& messages,
                                             std::map<std::uint64_t, Time> told, const TimeRange& range) {
         ListReader reader("Ostrel_GSM", messages);
@@ -126,7 +126,7 @@ TEST_F(DecodingTest, KeepsTheHistoryForThoseWhoWantIt) {
     struct Ended final : DecodingObserver {
         explicit Ended(bool wanted) : wantsIt(wanted) {}
         [[nodiscard]] bool wantsHistory(std::uint64_t) const override { return wantsIt; }
-        void ended(const LogGenerator&, const Dictionary& state) override {
+        void didFinish(const LogGenerator&, const Dictionary& state) override {
             const Array* history = state["History"].asArray();
             entries = history ? history->size() : 0;
             hasRawMessages = state.contains("DisplayState");
@@ -154,7 +154,7 @@ TEST_F(DecodingTest, TimeStampsMayGoBackAndJumpAhead) {
                 ElementsAre(Refresh{at(2000), "RR_INACTIVE"}, Refresh{Time::max(), "RR_IDLE"}));
 }
 
-TEST_F(DecodingTest, RefreshesThatTheFileTellsOfGoBeforeTheTicks) {
+TEST_F(DecodingTest, RefreshesRecordedInTheFileReplaceTheTicks) {
     const std::vector<TimedMessage> messages = {{at(0), rrState(4)},
                                                 {at(1000), rrState(5)},
                                                 {at(7000), rrState(0)},
@@ -164,12 +164,13 @@ TEST_F(DecodingTest, RefreshesThatTheFileTellsOfGoBeforeTheTicks) {
     EXPECT_THAT(refreshesOf(messages, told, {}),
                 ElementsAre(Refresh{at(1500), "RR_IDLE"}, Refresh{at(12'100), "RR_GOING_ACTIVE"},
                             Refresh{at(17'100), "RR_GOING_INACTIVE"}));
-    // A refresh whose latest message is not wanted shows those before; one without any is none.
+    // A refresh whose latest message is outside the range shows the earlier ones; without any there is no
+    // refresh.
     EXPECT_THAT(refreshesOf(messages, told, rangeOf(std::nullopt, at(1000))),
                 ElementsAre(Refresh{at(1500), "RR_PLMN_LIST_CONSTRUCTION"}));
 }
 
-TEST_F(DecodingTest, MessagesOutsideOfTheRangeArePassedOver) {
+TEST_F(DecodingTest, MessagesOutsideTheRangeAreSkipped) {
     const std::vector<TimedMessage> messages = {
         {at(0), rrState(4)}, {at(1000), rrState(5)}, {at(2999), rrState(0)}, {at(3000), rrState(1)}};
     // The start belongs to the range and the end does not; ticks count from the first message inside.
@@ -229,8 +230,8 @@ TEST_F(DecodingTest, TechnologyIsShownInShort) {
 }
 
 TEST(PlaceInFileTest, NamesTheRecordWhereThereIsOne) {
-    EXPECT_EQ(placeInFile("drive.pcapng", 3, 1200), "drive.pcapng: record 3 at offset 1200");
-    EXPECT_EQ(placeInFile("drive.pcapng", 0, 0), "drive.pcapng");
+    EXPECT_EQ(positionInFile("drive.pcapng", 3, 1200), "drive.pcapng: record 3 at offset 1200");
+    EXPECT_EQ(positionInFile("drive.pcapng", 0, 0), "drive.pcapng");
     EXPECT_EQ(fileTitle("-"), "standard input");
     EXPECT_EQ(fileTitle("a"), "a");
 }

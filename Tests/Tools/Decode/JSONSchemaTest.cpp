@@ -17,7 +17,7 @@ namespace {
 
 class JSONSchemaTest : public ToolTest {
 protected:
-    /// So much of the drive that every code has come, with a few messages that are odd.
+    /// Enough of the drive for every code, with a few unusual messages.
     void writeDrive(const ScenarioKind& kind, std::size_t count) const {
         const std::unique_ptr<Scenario> scenario = kind.make(1);
         const bool binary = scenario->technology() != kVoxLogChannelTechnology_IFX;

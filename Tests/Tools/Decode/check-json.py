@@ -2,7 +2,7 @@
 # SPDX-License-Identifier: MIT
 """Checks JSON against a schema: check-json.py SCHEMA < TEXT
 
-One object a line, or several indented ones one behind the other where the first line is not one whole object.
+One object a line, or several indented ones, one after another, if the first line is not a complete object.
 Prints how many objects there were; anything that is wrong ends it with a message and status 1."""
 
 import json

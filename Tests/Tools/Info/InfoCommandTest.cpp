@@ -18,13 +18,13 @@ TEST_F(InfoCommandTest, CountsMessagesByLogCodeWithTheirSections) {
     const std::vector<std::uint64_t> offsets =
         writeRecording("drive.pcapng", "Ostrel_GSM",
                        {
-                           {at(1250), rrState(4)},                           // 17 bytes
-                           {at(0), rrState(5)},                              // 17, the earliest
-                           {at(3600'001), joined(hex("81 00"), rrState(5))}, // 19, the latest
-                           {at(1300), record(0x1234, "")},                   // 13, which no section wants
-                           {at(1400), extraRecord(0, makeDictionary())},     // SIM files
-                           {at(1500), hex("01 02 03")},                      // 3, too short
-                           {at(1600), record(0x512C, "00", 2)},              // 14, of no known type
+                           {at(1250), rrState(4)},                                 // 17 bytes
+                           {at(0), rrState(5)},                                    // 17, the earliest
+                           {at(3600'001), joined(hex("81 00"), rrState(5))},       // 19, the latest
+                           {at(1300), record(0x1234, "")},                         // 13, without subscriber
+                           {at(1400), extraRecord(0, makeDictionary())},           // SIM files
+                           {at(1500), hex("01 02 03")},                            // 3, too short
+                           {at(1600), record(0x512C, "00", 2)},                    // 14, of no known type
                            {at(1700), hex("01 02 03 04 05 06 07 08 09 0A 0B 0C")}, // 12, too short
                        });
     const std::size_t simSize = extraRecord(0, makeDictionary()).size();
@@ -54,7 +54,7 @@ TEST_F(InfoCommandTest, CountsMessagesByLogCodeWithTheirSections) {
                                     "  0x1234            1  -\n"
                                     "  0x512C            3  GSM RR Info\n"
                                     "0xFF0000            1  SIM Info\n");
-    EXPECT_EQ(ownWords(process.errors()), "");
+    EXPECT_EQ(ownMessages(process.errors()), "");
 }
 
 TEST_F(InfoCommandTest, SerializedObjectsHaveNoLogCodes) {
@@ -98,7 +98,7 @@ TEST_F(InfoCommandTest, LossIsShownAndMakesTheInputBad) {
                                     "\n"
                                     "    code     messages  sections\n"
                                     "  0x512C            1  GSM RR Info\n");
-    EXPECT_EQ(ownWords(process.errors()), "velmora-log: " + path("cut.pcapng") + ": " + place);
+    EXPECT_EQ(ownMessages(process.errors()), "velmora-log: " + path("cut.pcapng") + ": " + place);
 }
 
 TEST_F(InfoCommandTest, RecordingWithoutATechnologyIsCountedAllTheSame) {
@@ -108,7 +108,7 @@ TEST_F(InfoCommandTest, RecordingWithoutATechnologyIsCountedAllTheSame) {
     EXPECT_THAT(process.output(), testing::StartsWith("form:       recording\ntechnology: not named\n"));
     EXPECT_THAT(process.output(), testing::EndsWith("  0x512C            1  -\n"));
     EXPECT_EQ(
-        ownWords(process.errors()),
+        ownMessages(process.errors()),
         "velmora-log: " + path("none.pcapng") +
             ": names no technology, wanted one of IFX, Ostrel_GSM, Ostrel_CDMA, Ostrel_LTE, Ostrel_UTRAN2\n");
 }
@@ -149,11 +149,11 @@ TEST_F(InfoCommandTest, TechnologyIsTheUsersBeforeTheFiles) {
     EXPECT_THAT(process.output(), testing::EndsWith("  0x512C            1  GSM RR Info\n"));
 }
 
-TEST_F(InfoCommandTest, FileThatIsNotThereIsTold) {
+TEST_F(InfoCommandTest, MissingFileIsReported) {
     ToolProcess process(tool({"info", path("gone.pcapng")}));
     EXPECT_EQ(process.exitStatus(), 1);
     EXPECT_EQ(process.output(), "");
-    EXPECT_EQ(ownWords(process.errors()),
+    EXPECT_EQ(ownMessages(process.errors()),
               "velmora-log: " + path("gone.pcapng") + ": cannot open: No such file or directory\n");
 }
 

@@ -28,7 +28,7 @@ TEST_F(RecordCommandTest, RecordsWhatArrivesUntilInterrupted) {
     process.signal(SIGINT);
     EXPECT_EQ(process.exitStatus(), 0);
     EXPECT_EQ(process.output(), "");
-    EXPECT_EQ(ownWords(process.errors()), "velmora-log: recorded 3 messages of Ostrel_GSM, 36 bytes\n");
+    EXPECT_EQ(ownMessages(process.errors()), "velmora-log: recorded 3 messages of Ostrel_GSM, 36 bytes\n");
     EXPECT_THAT(messagesOf("drive.pcapng", "Ostrel_GSM"),
                 ElementsAre(rrState(5), record(0x0000, "DE AD BE EF", 0xFF), hex("01 02")));
     _service.reset();
@@ -67,14 +67,14 @@ TEST_F(RecordCommandTest, DurationEndsARecordingWithoutMessages) {
     startService();
     ToolProcess process(tool({"record", "--duration", "0.2", path("drive.pcapng")}));
     EXPECT_EQ(process.exitStatus(), 0);
-    EXPECT_EQ(ownWords(process.errors()), "velmora-log: recorded 0 messages of Ostrel_GSM, 0 bytes\n");
+    EXPECT_EQ(ownMessages(process.errors()), "velmora-log: recorded 0 messages of Ostrel_GSM, 0 bytes\n");
     EXPECT_THAT(messagesOf("drive.pcapng", "Ostrel_GSM"), ElementsAre());
 }
 
 TEST_F(RecordCommandTest, WithoutAServiceNoFileIsLeft) {
     ToolProcess process(tool({"record", "--duration", "0.2", path("drive.pcapng")}));
     EXPECT_EQ(process.exitStatus(), 1);
-    EXPECT_EQ(ownWords(process.errors()),
+    EXPECT_EQ(ownMessages(process.errors()),
               "velmora-log: nothing was recorded: the telephony service has named no technology\n");
     EXPECT_FALSE(exists("drive.pcapng"));
 }
@@ -85,7 +85,7 @@ TEST_F(RecordCommandTest, FileThatIsThereIsKeptUnlessForced) {
     const std::string before = contentOf("drive.pcapng");
     ToolProcess refused(tool({"record", path("drive.pcapng")}));
     EXPECT_EQ(refused.exitStatus(), 1);
-    EXPECT_EQ(ownWords(refused.errors()),
+    EXPECT_EQ(ownMessages(refused.errors()),
               "velmora-log: " + path("drive.pcapng") + " is there already; --force overwrites it\n");
     EXPECT_EQ(contentOf("drive.pcapng"), before);
 
@@ -102,18 +102,19 @@ TEST_F(RecordCommandTest, FileThatIsThereIsKeptUnlessForced) {
     EXPECT_THAT(messagesOf("drive.pcapng", "Ostrel_GSM"), ElementsAre(rrState(5)));
 }
 
-TEST_F(RecordCommandTest, FileThatCannotBeMadeIsToldAtOnce) {
+TEST_F(RecordCommandTest, UncreatableFileIsReportedImmediately) {
     ToolProcess process(tool({"record", path("nowhere/drive.pcapng")}));
     EXPECT_EQ(process.exitStatus(), 1);
-    EXPECT_EQ(ownWords(process.errors()),
+    EXPECT_EQ(ownMessages(process.errors()),
               "velmora-log: cannot create " + path("nowhere/drive.pcapng") + ": No such file or directory\n");
 }
 
-TEST_F(RecordCommandTest, FullDiskIsToldAtOnce) {
+TEST_F(RecordCommandTest, FullDiskIsReportedImmediately) {
     startService();
     ToolProcess process(tool({"record", "/dev/full"}));
     EXPECT_EQ(process.exitStatus(), 1);
-    EXPECT_EQ(ownWords(process.errors()), "velmora-log: cannot write /dev/full: No space left on device\n");
+    EXPECT_EQ(ownMessages(process.errors()),
+              "velmora-log: cannot write /dev/full: No space left on device\n");
 }
 
 TEST_F(RecordCommandTest, AnotherTechnologyEndsTheRecording) {
@@ -125,18 +126,18 @@ TEST_F(RecordCommandTest, AnotherTechnologyEndsTheRecording) {
     _service.reset();
     startService("IFX");
     EXPECT_EQ(process.exitStatus(), 1);
-    EXPECT_EQ(ownWords(process.errors()),
+    EXPECT_EQ(ownMessages(process.errors()),
               "velmora-log: the telephony service is gone; waiting for it\n"
               "velmora-log: the telephony service now speaks IFX, the recording is of Ostrel_GSM\n"
               "velmora-log: recorded 1 messages of Ostrel_GSM, 17 bytes\n");
     EXPECT_THAT(messagesOf("drive.pcapng", "Ostrel_GSM"), ElementsAre(rrState(5)));
 }
 
-TEST_F(RecordCommandTest, TechnologyWithoutADecoderIsTold) {
+TEST_F(RecordCommandTest, TechnologyWithoutADecoderIsReported) {
     startService("Nonesuch");
     ToolProcess process(tool({"record", path("drive.pcapng")}));
     EXPECT_EQ(process.exitStatus(), 1);
-    EXPECT_EQ(ownWords(process.errors()),
+    EXPECT_EQ(ownMessages(process.errors()),
               "velmora-log: the telephony service speaks Nonesuch, which has no decoder "
               "here, wanted one of IFX, Ostrel_GSM, Ostrel_CDMA, Ostrel_LTE, "
               "Ostrel_UTRAN2\n");
@@ -174,7 +175,7 @@ TEST_F(RecordCommandTest, ClosedPipeEndsItQuietly) {
     ASSERT_TRUE(isStreaming());
     process.stopReading();
     EXPECT_EQ(process.exitStatus(), 0);
-    EXPECT_EQ(ownWords(process.errors()), "velmora-log: recorded 0 messages of Ostrel_GSM, 0 bytes\n");
+    EXPECT_EQ(ownMessages(process.errors()), "velmora-log: recorded 0 messages of Ostrel_GSM, 0 bytes\n");
 }
 
 } // namespace

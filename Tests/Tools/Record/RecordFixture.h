@@ -13,7 +13,7 @@
 
 namespace velmora {
 
-/// A recorder's surroundings: a telephony service on the test's event loop, and a look into its files.
+/// A recorder's surroundings: a telephony service on the test's event loop, and access to its files.
 class RecordTest : public ToolTest {
 protected:
     void startService(const std::string& technology = "Ostrel_GSM") {
@@ -22,7 +22,7 @@ protected:
     [[nodiscard]] bool isStreaming(std::size_t clients = 1) {
         return eventually([&] { return _service->streaming() == clients; });
     }
-    /// The messages of a recording that must be whole.
+    /// The messages of a recording that must be complete.
     [[nodiscard]] std::vector<Data> messagesOf(const std::string& name, const std::string& technology) const {
         const auto reader = openMessages(path(name));
         if (!reader) {

@@ -60,11 +60,11 @@ protected:
 TEST_F(RecordingSessionTest, OverwrittenFileGivesWayInOneStep) {
     putOld();
     std::filesystem::permissions(_file, std::filesystem::perms(0640));
-    std::ifstream old(_file); // whoever has it open keeps it
+    std::ifstream old(_file); // an open descriptor keeps it
     const auto session = RecordingSession::open(_file, true);
     ASSERT_TRUE(session);
     EXPECT_EQ(contentOf("drives/drive.pcapng"), "old");
-    ASSERT_TRUE((*session)->learnTechnology("Ostrel_GSM"));
+    ASSERT_TRUE((*session)->setTechnology("Ostrel_GSM"));
     EXPECT_THAT(messagesOf("drives/drive.pcapng", "Ostrel_GSM"), ElementsAre());
     EXPECT_THAT(files(), ElementsAre("drive.pcapng"));
     ASSERT_TRUE((*session)->append(Time(), rrState(5).bytes()));
@@ -84,7 +84,7 @@ TEST_F(RecordingSessionTest, OverwrittenFileStaysWhereTheNewOneCannotBegin) {
         Result<Done> begun = Done{};
         {
             const FileSizeLimit limit(0);
-            begun = (*session)->learnTechnology("Ostrel_GSM");
+            begun = (*session)->setTechnology("Ostrel_GSM");
         }
         EXPECT_EQ(begun.reason(), "cannot write " + _file + ": File too large");
     }
@@ -97,7 +97,7 @@ TEST_F(RecordingSessionTest, SymbolicLinkStaysOne) {
     std::filesystem::create_symlink(_file, _directory / "link.pcapng");
     const auto session = RecordingSession::open(path("link.pcapng"), true);
     ASSERT_TRUE(session);
-    ASSERT_TRUE((*session)->learnTechnology("Ostrel_GSM"));
+    ASSERT_TRUE((*session)->setTechnology("Ostrel_GSM"));
     ASSERT_TRUE((*session)->close());
     EXPECT_TRUE(std::filesystem::is_symlink(_directory / "link.pcapng"));
     EXPECT_THAT(messagesOf("drives/drive.pcapng", "Ostrel_GSM"), ElementsAre());
@@ -108,9 +108,9 @@ TEST_F(RecordingSessionTest, FileThatNothingWasWrittenToIsRemoved) {
         const auto session = RecordingSession::open(_file, false);
         ASSERT_TRUE(session);
         const FileSizeLimit limit(0);
-        ASSERT_TRUE((*session)->learnTechnology("Ostrel_GSM")); // the head waits
+        ASSERT_TRUE((*session)->setTechnology("Ostrel_GSM")); // the head waits
         EXPECT_FALSE((*session)->close());
-        EXPECT_EQ((*session)->trouble(), "cannot write " + _file + ": File too large");
+        EXPECT_EQ((*session)->temporaryError(), "cannot write " + _file + ": File too large");
     }
     EXPECT_THAT(files(), ElementsAre());
 }
@@ -123,12 +123,12 @@ TEST_F(RecordingSessionTest, ProgramThatEndsAbruptlyRemovesOnlyAnEmptyFile) {
 
     const auto another = RecordingSession::open(_file, false);
     ASSERT_TRUE(another);
-    ASSERT_TRUE((*another)->learnTechnology("Ostrel_GSM"));
+    ASSERT_TRUE((*another)->setTechnology("Ostrel_GSM"));
     (*another)->removeIfEmpty();
     EXPECT_THAT(files(), ElementsAre("drive.pcapng"));
 }
 
-TEST_F(RecordingSessionTest, EmptyFileOfSomebodyElsesIsNotRemoved) {
+TEST_F(RecordingSessionTest, ForeignEmptyFileIsNotRemoved) {
     std::ofstream(_file).close();
     {
         const auto session = RecordingSession::open(_file, true);

@@ -16,7 +16,7 @@ std::string cell(const Value& value) {
     return std::string(out.view());
 }
 
-TEST(CSVTextTest, CellsAreValidWhateverTheyHold) {
+TEST(CSVTextTest, CellsAreValidForAnyContent) {
     using namespace std::string_literals;
     struct Case {
         Value value;

@@ -91,7 +91,7 @@ TEST(JSONTextTest, OneLineHasNoBlanks) {
     EXPECT_EQ(out.view(), R"(before {"b":["first row",null,[]],"a":{}})");
 }
 
-TEST(JSONTextTest, StringsAreValidWhateverTheyHold) {
+TEST(JSONTextTest, StringsAreValidForAnyContent) {
     EXPECT_EQ(jsonString("quote \" backslash \\ feed \n bell \x07"),
               R"("quote \" backslash \\ feed \n bell \u0007")");
     EXPECT_EQ(jsonString("\b\f\r\t\x1F\x7F"), "\"\\b\\f\\r\\t\\u001f\x7F\"");
@@ -106,7 +106,7 @@ TEST(JSONTextTest, StringsAreValidWhateverTheyHold) {
     EXPECT_EQ(jsonString("\xED\xA0\x80"), "\"\xEF\xBF\xBD\xEF\xBF\xBD\xEF\xBF\xBD\"");
 }
 
-TEST(JSONTextTest, EveryByteIsSeenWhereverItStands) {
+TEST(JSONTextTest, EveryByteIsFoundAtAnyOffset) {
     // Texts are looked at in words of eight bytes: every place in a text of up to three words, every byte.
     for (std::size_t length = 1; length <= 24; ++length) {
         for (std::size_t place = 0; place < length; ++place) {

@@ -42,14 +42,14 @@ TEST(PrintableTextTest, WidthCountsTerminalColumns) {
     EXPECT_EQ(displayWidth("u\xCC\x88"), 1U);                // u and the dots above it
     EXPECT_EQ(displayWidth("\xE6\x97\xA5\xE6\x9C\xAC"), 4U); // two wide characters
     EXPECT_EQ(displayWidth("\xF0\x9F\x93\xA1"), 2U);         // satellite antenna
-    EXPECT_EQ(displayWidth("\xEF\xBF\xBD"), 1U);             // what stands for bytes of no character
+    EXPECT_EQ(displayWidth("\xEF\xBF\xBD"), 1U);             // the replacement of invalid bytes
     EXPECT_EQ(displayWidth("\xD9\xB0"), 0U);                 // Arabic letter superscript alef, a mark
     EXPECT_EQ(displayWidth("\xE2\x8F\xB0"), 2U);             // alarm clock, an emoji outside of their block
     EXPECT_EQ(displayWidth("\xEF\xBF\xA5"), 2U);             // fullwidth yen sign
     EXPECT_EQ(displayWidth("\xF0\x9F\x8C\xA1"), 1U);         // thermometer, which shows as text
 }
 
-TEST(PrintableTextTest, ClippedTextFitsAndTellsThatItWasCut) {
+TEST(PrintableTextTest, ClippedTextFitsAndEndsInAnEllipsis) {
     EXPECT_EQ(clipped("abcdef", 6), "abcdef");
     EXPECT_EQ(clipped("abcdef", 5), "abcd…");
     EXPECT_EQ(clipped("abcdef", 1), "…");

@@ -45,7 +45,7 @@ TEST(TreeTextTest, WidthsAreTerminalColumns) {
               "gr\xC3\xBC\xC3\x9F   a\n12345  b\n");
 }
 
-TEST(TreeTextTest, EmptyValuesAndBranchesLeaveNoBlanksBehind) {
+TEST(TreeTextTest, EmptyValuesAndBranchesHaveNoTrailingBlanks) {
     EXPECT_EQ(
         textOf(dictionary({{"A", ""}, {"B", makeDictionary()}, {"C", makeArray()}, {"", "x"}, {" ", ""}})),
         "A\nB\nC\n   x\n\n");

@@ -22,7 +22,7 @@ TEST(KeyReaderTest, EachKeyHasItsSequences) {
     EXPECT_THAT(reader.take("\x03"), ElementsAre(Key::Quit));
 }
 
-TEST(KeyReaderTest, SequencesMayComeInPieces) {
+TEST(KeyReaderTest, SequencesMayBeSplit) {
     KeyReader reader;
     EXPECT_THAT(reader.take("\x1b"), ElementsAre());
     EXPECT_THAT(reader.take("["), ElementsAre());
@@ -30,7 +30,7 @@ TEST(KeyReaderTest, SequencesMayComeInPieces) {
     EXPECT_THAT(reader.take("~j"), ElementsAre(Key::PageDown, Key::Down));
 }
 
-TEST(KeyReaderTest, OtherKeysArePassedOverAsAWhole) {
+TEST(KeyReaderTest, OtherKeySequencesAreSkippedCompletely) {
     KeyReader reader;
     EXPECT_THAT(reader.take("xyz\n"), ElementsAre());
     // Ctrl-Up ends in A, F5 in ~, and neither is a key here.

@@ -16,7 +16,7 @@ std::vector<TreeRow> rowsOf(std::size_t count) {
     return rows;
 }
 
-TEST(TerminalFrameTest, RowsStandAboveTheStatusLine) {
+TEST(TerminalFrameTest, RowsAreAboveTheStatusLine) {
     const std::vector<TreeRow> rows = {{"Cell", true}, {"  ARFCN  33", false}};
     EXPECT_EQ(composeFrame(rows, "Connecting...", {20, 4}, 0), "\x1b[H"
                                                                "\x1b[1mCell\x1b[0m\x1b[K\r\n"
@@ -30,7 +30,7 @@ TEST(TerminalFrameTest, WithoutRowsTheScreenIsBlankAboveTheStatusLine) {
 }
 
 TEST(TerminalFrameTest, LongRowsAndStatusAreCutAtTheWindow) {
-    // A full line is not cleared behind its end: that would take its last character.
+    // A full line is not cleared past its end: that would take its last character.
     EXPECT_EQ(composeFrame({{"0123456789", false}, {"01234567", false}}, "0123456789", {8, 3}, 0),
               "\x1b[H"
               "0123456…\r\n"
@@ -38,7 +38,7 @@ TEST(TerminalFrameTest, LongRowsAndStatusAreCutAtTheWindow) {
               "\x1b[7m0123456…\x1b[0m");
 }
 
-TEST(TerminalFrameTest, ScrolledScreenTellsWhereItIs) {
+TEST(TerminalFrameTest, ScrolledScreenShowsItsPosition) {
     EXPECT_EQ(composeFrame(rowsOf(10), "ok", {12, 4}, 5), "\x1b[H"
                                                           "row 5\x1b[K\r\n"
                                                           "row 6\x1b[K\r\n"

@@ -145,15 +145,15 @@ TEST_F(WatchCommandTest, ClosedPipeEndsItQuietlyWithoutARefresh) {
     ASSERT_TRUE(isStreaming());
     process.stopReading();
     EXPECT_EQ(process.exitStatus(), 0);
-    EXPECT_EQ(ownWords(process.errors()), "");
+    EXPECT_EQ(ownMessages(process.errors()), "");
 }
 
-TEST_F(WatchCommandTest, FullDiskIsTold) {
+TEST_F(WatchCommandTest, FullDiskIsReported) {
     ToolProcess::Setup setup = tool({"watch"});
     setup.outputFile = "/dev/full";
     ToolProcess process(setup);
     EXPECT_EQ(process.exitStatus(), 1);
-    EXPECT_EQ(ownWords(process.errors()),
+    EXPECT_EQ(ownMessages(process.errors()),
               "velmora-log: cannot write standard output: No space left on device\n");
 }
 
@@ -169,13 +169,13 @@ TEST_F(WatchCommandTest, SeveralWatchersRunAtOnce) {
     EXPECT_THAT(other.output(), EndsWith("\nBand  GSM 900\n"));
 }
 
-TEST_F(WatchCommandTest, UnreadableSimFilesEndTheProgramInTheirWords) {
+TEST_F(WatchCommandTest, UnreadableSimFilesEndTheProgramWithTheirMessage) {
     startService("Ostrel_GSM");
     ToolProcess process(onTerminal({"watch"}));
     ASSERT_TRUE(isStreaming());
     _service->send(record(0x0000, "DE AD BE EF", 0xFF));
     EXPECT_EQ(process.exitStatus(), 1);
-    EXPECT_EQ(ownWords(process.errors()),
+    EXPECT_EQ(ownMessages(process.errors()),
               "velmora-log: the telephony service: SIM File dictionary data could not be constructed\n");
     EXPECT_THAT(process.output(), EndsWith(leaveScreen));
     _service.reset();
@@ -224,7 +224,7 @@ TEST_F(WatchTerminalTest, DrawsInPlaceScrollsAndRestores) {
     EXPECT_EQ(process.exitStatus(), 0);
     EXPECT_THAT(process.output(), EndsWith(leaveScreen));
     EXPECT_TRUE(echoes(process));
-    EXPECT_EQ(ownWords(process.errors()), "");
+    EXPECT_EQ(ownMessages(process.errors()), "");
 }
 
 TEST_F(WatchTerminalTest, FollowsTheSizeOfTheWindow) {

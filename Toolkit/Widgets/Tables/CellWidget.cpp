@@ -37,7 +37,7 @@ void CellWidget::set(bool& flag, bool value) {
 }
 
 void CellWidget::announceName() {
-    if (!announcementsAreHeard() || !cell)
+    if (!hasAnnouncementListener() || !cell)
         return;
     std::string name = cell->rowName();
     if (name == _announcedName)

@@ -17,11 +17,11 @@ class CellWidget : public QWidget {
 public:
     CellWidget();
 
-    /// Null once the cell is gone.
+    /// Null after the cell's destruction.
     TableCell* cell = nullptr;
-    /// The row that the cell stands for, counted through all sections; none while it waits to be used again.
+    /// The cell's row, counted through all sections; absent while it is queued for reuse.
     std::optional<std::size_t> row;
-    /// The row that it last stood for.
+    /// Its previous row.
     std::optional<std::size_t> lastRow;
 
     void setSelected(bool isSelected);
@@ -30,7 +30,7 @@ public:
     [[nodiscard]] bool isSelected() const { return _isSelected; }
     [[nodiscard]] bool isHighlighted() const { return _isSelected || _isPressed; }
     [[nodiscard]] bool hasFocusFrame() const { return _hasFocusFrame; }
-    /// Tells a screen reader when the row is called otherwise than when this was last asked.
+    /// Announces the row's name to screen readers if it has changed since the last call.
     void announceName();
 
     /// How much an accessory takes of the cell's width.

@@ -3,10 +3,10 @@
 
 #include "Toolkit/Widgets/Tables/TableInput.h"
 
-#include "Toolkit/Widgets/Finger.h"
 #include "Toolkit/Widgets/ScrollWidget.h"
 #include "Toolkit/Widgets/Tables/CellWidget.h"
 #include "Toolkit/Widgets/Tables/TableWidget.h"
+#include "Toolkit/Widgets/TouchScroll.h"
 
 #include <QKeyEvent>
 #include <QMouseEvent>
@@ -57,11 +57,11 @@ bool TableInput::handle(QEvent* event) {
         return _pressed.has_value();
     case QEvent::ScrollPrepare: {
         auto* const prepare = static_cast<QScrollPrepareEvent*>(event);
-        _underFinger = ScrollWidget::at(*_table.viewport(), prepare->startPos().toPoint());
+        _underTouch = ScrollWidget::at(*_table.viewport(), prepare->startPos().toPoint());
         prepare->setViewportSize(_table.viewport()->size());
-        prepare->setContentPosRange({0, 0, _underFinger ? _underFinger->maximumOffset() : 0,
+        prepare->setContentPosRange({0, 0, _underTouch ? _underTouch->maximumOffset() : 0,
                                      static_cast<double>(_table.verticalScrollBar()->maximum())});
-        prepare->setContentPos({_underFinger ? _underFinger->offset() : 0,
+        prepare->setContentPos({_underTouch ? _underTouch->offset() : 0,
                                 static_cast<double>(_table.verticalScrollBar()->value())});
         prepare->accept();
         return true;
@@ -70,8 +70,8 @@ bool TableInput::handle(QEvent* event) {
         // The finger moves: it does not mean the row that it came down on.
         cancelPress();
         const QPointF place = static_cast<QScrollEvent*>(event)->contentPos();
-        if (_underFinger)
-            _underFinger->setOffset(place.x());
+        if (_underTouch)
+            _underTouch->setOffset(place.x());
         _table.verticalScrollBar()->setValue(static_cast<int>(std::round(place.y())));
         return true;
     }
@@ -80,7 +80,7 @@ bool TableInput::handle(QEvent* event) {
 }
 
 void TableInput::touch(const QTouchEvent& event) {
-    const bool isScroll = followFinger(*_table.viewport(), event);
+    const bool isScroll = scrollByTouch(*_table.viewport(), event);
     if (event.type() == QEvent::TouchCancel || event.points().isEmpty()) {
         cancelPress();
         return;
@@ -108,7 +108,7 @@ bool TableInput::release(const QPoint& place) {
     const bool isTap = row && row == _pressed;
     cancelPress();
     if (isTap)
-        _table.choose(*row);
+        _table.activateRow(*row);
     return true;
 }
 
@@ -132,7 +132,7 @@ void TableInput::handleKey(QKeyEvent* event) {
     case Qt::Key_Select:
         event->accept();
         if (_table.focusRow() && !event->isAutoRepeat())
-            _table.choose(*_table.focusRow());
+            _table.activateRow(*_table.focusRow());
         break;
     default: event->setAccepted(moveFocus(event->key())); break;
     }

@@ -19,8 +19,8 @@ namespace velmora {
 class ScrollWidget;
 class TableWidget;
 
-/// What fingers, mouse and keys do in a table. A finger's stroke moves the rows or, sideways, the row under
-/// it.
+/// Touch, mouse and keyboard input of a table. A vertical swipe scrolls the rows, a horizontal one the row
+/// under it.
 class TableInput {
 public:
     explicit TableInput(TableWidget& table);
@@ -40,7 +40,7 @@ private:
 
     TableWidget& _table;
     std::optional<std::size_t> _pressed;
-    QPointer<ScrollWidget> _underFinger;
+    QPointer<ScrollWidget> _underTouch;
 };
 
 } // namespace velmora

@@ -73,7 +73,7 @@ void TableWidget::reload() {
         announceFocus();
 }
 
-void TableWidget::loadOnce() {
+void TableWidget::loadIfNeeded() {
     if (!_isLoaded)
         reload();
 }
@@ -147,7 +147,7 @@ void TableWidget::scrollToRow(std::size_t row) {
         bar->setValue(bar->value() + rect.bottom() + 1 - viewport()->height());
 }
 
-void TableWidget::choose(std::size_t row) {
+void TableWidget::activateRow(std::size_t row) {
     _focus = row;
     setSelectedRow(row);
     if (delegate && view)
@@ -241,7 +241,7 @@ void TableWidget::resizeEvent(QResizeEvent* event) {
 
 void TableWidget::showEvent(QShowEvent* event) {
     QAbstractScrollArea::showEvent(event);
-    loadOnce();
+    loadIfNeeded();
 }
 
 void TableWidget::scrollContentsBy(int /*dx*/, int /*dy*/) {

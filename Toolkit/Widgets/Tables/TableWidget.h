@@ -3,7 +3,7 @@
 
 #pragma once
 
-#include "Toolkit/Widgets/Tables/CellQueue.h"
+#include "Toolkit/Widgets/Tables/ReuseQueue.h"
 #include "Toolkit/Widgets/Tables/TableInput.h"
 #include "Toolkit/Widgets/Tables/TableRows.h"
 
@@ -29,14 +29,14 @@ public:
     TableWidget();
     ~TableWidget() override;
 
-    /// Null once the table view is gone.
+    /// Null after the table view's destruction.
     TableView* view = nullptr;
     TableViewDataSource* dataSource = nullptr;
     TableViewDelegate* delegate = nullptr;
 
     void reload();
-    /// Loads the rows if nobody has yet.
-    void loadOnce();
+    /// Loads the rows if they are not loaded yet.
+    void loadIfNeeded();
     [[nodiscard]] std::shared_ptr<TableCell> dequeue(std::string_view identifier);
     void releaseCells();
 
@@ -54,13 +54,13 @@ public:
     [[nodiscard]] std::optional<std::size_t> focusRow() const { return _focus; }
     void setSelectedRow(std::optional<std::size_t> row);
     void setPressedRow(std::optional<std::size_t> row);
-    /// Scrolls to it and tells a screen reader.
+    /// Scrolls to it and notifies a screen reader.
     void setFocusRow(std::optional<std::size_t> row);
-    /// The focus frame shows once the keyboard is used and goes with the next click.
+    /// The focus frame is shown after keyboard use and hidden by the next click.
     void setShowsFocus(bool shows);
     void scrollToRow(std::size_t row);
-    /// Selects the row and tells the delegate, which may destroy the table.
-    void choose(std::size_t row);
+    /// Selects the row and notifies the delegate, which may destroy the table.
+    void activateRow(std::size_t row);
 
 protected:
     void resizeEvent(QResizeEvent* event) override;
@@ -82,7 +82,7 @@ private:
 
     TableRows _rows;
     std::map<std::size_t, std::shared_ptr<TableCell>> _cells;
-    CellQueue _queue;
+    ReuseQueue _queue;
     TableInput _input;
     std::optional<std::size_t> _selected;
     std::optional<std::size_t> _focus;

@@ -17,7 +17,7 @@ class Output;
 /// /tmp). Without such a directory, or on a file system that has no files without a name, it keeps nothing.
 class Spool {
 public:
-    /// How much it keeps, give or take the last piece.
+    /// The size at which it is full; the last text may exceed it.
     static constexpr std::uint64_t maximumSize = std::uint64_t{256} << 20;
 
     Spool();
@@ -27,8 +27,8 @@ public:
     /// False where the file did not take all of the text; then none of it is kept.
     [[nodiscard]] bool append(std::string_view text);
 
-    /// Writes everything to the output and gives the file up. `buffer` is where the pieces are read to. False
-    /// where the file cannot be read back.
+    /// Writes everything to the output and closes the file. `buffer` is used for reading. False where the
+    /// file cannot be read back.
     [[nodiscard]] bool moveTo(Output& output, std::vector<char>& buffer);
 
 private:

@@ -7,7 +7,7 @@
 
 #include <algorithm>
 
-// `decode --jobs`: several files side by side.
+// `decode --jobs`: several files in parallel.
 
 namespace velmora {
 namespace {
@@ -16,7 +16,7 @@ using testing::StartsWith;
 
 class DecodeJobsTest : public DecodeLinesTest {};
 
-TEST_F(DecodeJobsTest, JobsPrintWhatOneAfterTheOtherPrints) {
+TEST_F(DecodeJobsTest, ParallelJobsPrintWhatSequentialOnesPrint) {
     writeDrive("a.pcapng");
     writeRecording("empty.pcapng", "Ostrel_GSM", {});
     // More than a pipe holds, at both ends of the row.
@@ -40,10 +40,10 @@ TEST_F(DecodeJobsTest, JobsPrintWhatOneAfterTheOtherPrints) {
             arguments.resize(arguments.size() - 2);
             EXPECT_EQ(side.exitStatus(), 1);
             EXPECT_TRUE(side.output() == serial.output()) << jobs << " jobs";
-            EXPECT_EQ(ownWords(side.errors()),
+            EXPECT_EQ(ownMessages(side.errors()),
                       "velmora-log: " + path("gone.pcapng") + ": cannot open: No such file or directory\n");
         }
-        EXPECT_EQ(ownWords(serial.errors()),
+        EXPECT_EQ(ownMessages(serial.errors()),
                   "velmora-log: " + path("gone.pcapng") + ": cannot open: No such file or directory\n");
     }
 }
@@ -71,9 +71,9 @@ TEST_F(DecodeJobsTest, JobThatADecoderEndsEndsThoseAfterIt) {
     EXPECT_THAT(process.output(), StartsWith("time,file,/\r\n2026-11-16T05:00:02.000000000Z," +
                                              path("a.pcapng") + ",\"{\"\"GSM RR Info"));
     EXPECT_EQ(std::count(process.output().begin(), process.output().end(), '\r'), 3);
-    EXPECT_EQ(ownWords(process.errors()), "velmora-log: " + path("sim.pcapng") + ": record 1 at offset " +
-                                              std::to_string(offsets[0]) +
-                                              ": SIM File dictionary data could not be constructed\n");
+    EXPECT_EQ(ownMessages(process.errors()), "velmora-log: " + path("sim.pcapng") + ": record 1 at offset " +
+                                                 std::to_string(offsets[0]) +
+                                                 ": SIM File dictionary data could not be constructed\n");
 }
 
 TEST_F(DecodeJobsTest, StandardInputTwiceIsReadInTurn) {
@@ -84,7 +84,7 @@ TEST_F(DecodeJobsTest, StandardInputTwiceIsReadInTurn) {
     EXPECT_EQ(process.exitStatus(), 1);
     EXPECT_EQ(process.output(),
               std::string("{\"file\":\"-\",") + firstRefresh + "\n{\"file\":\"-\"," + secondRefresh + "\n");
-    EXPECT_THAT(ownWords(process.errors()), StartsWith("velmora-log: standard input: empty"));
+    EXPECT_THAT(ownMessages(process.errors()), StartsWith("velmora-log: standard input: empty"));
 }
 
 } // namespace

@@ -25,7 +25,7 @@ using namespace std::chrono_literals;
 
 class JobSchedulerTest : public testing::Test {
 protected:
-    /// Runs `count` jobs; gives whether all went well, and keeps what they wrote.
+    /// Runs `count` jobs; returns whether all succeeded, and keeps their output.
     bool run(std::size_t count, std::size_t atATime, const Job& job) {
         const std::string path = _directory / "output";
         bool good = false;

@@ -35,7 +35,7 @@ protected:
     }
     static void setDirectory(const std::string& path) { ::setenv("TMPDIR", path.c_str(), 1); }
 
-    /// What the spool gives when read back in pieces of `pieceSize`.
+    /// The spool's text, read back through a buffer of `pieceSize`.
     [[nodiscard]] std::string moved(Spool& spool, std::size_t pieceSize) const {
         const std::string path = _directory / "output";
         {

@@ -1,0 +1,131 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
+#include "Recording/Pcapng/PcapngBlocks.h"
+
+#include "Recording/Pcapng/ByteReader.h"
+#include "Recording/Pcapng/Pcapng.h"
+
+#include <algorithm>
+
+namespace velmora::pcapngBlocks {
+
+namespace {
+
+namespace BlockType = pcapng::BlockType;
+namespace Option = pcapng::Option;
+
+using Buffer = std::vector<std::uint8_t>;
+
+constexpr std::size_t packetOverhead = 32;
+constexpr std::uint8_t nanosecondResolution = 9;
+constexpr std::string_view application = VELMORA_RECORDING_APPLICATION;
+
+std::size_t optionSize(std::size_t length) {
+    return 4 + pcapng::padded(length);
+}
+
+void put16(Buffer& buffer, std::uint16_t value) {
+    buffer.push_back(static_cast<std::uint8_t>(value));
+    buffer.push_back(static_cast<std::uint8_t>(value >> 8));
+}
+
+void put32(Buffer& buffer, std::uint32_t value) {
+    put16(buffer, static_cast<std::uint16_t>(value));
+    put16(buffer, static_cast<std::uint16_t>(value >> 16));
+}
+
+void putPadded(Buffer& buffer, Bytes bytes) {
+    buffer.insert(buffer.end(), bytes.begin(), bytes.end());
+    buffer.resize(buffer.size() + pcapng::padded(bytes.size()) - bytes.size());
+}
+
+void putOption(Buffer& buffer, std::uint16_t code, Bytes value) {
+    put16(buffer, code);
+    put16(buffer, static_cast<std::uint16_t>(value.size()));
+    putPadded(buffer, value);
+}
+
+void putOption(Buffer& buffer, std::uint16_t code, std::string_view text) {
+    putOption(buffer, code, Bytes(reinterpret_cast<const std::uint8_t*>(text.data()), text.size()));
+}
+
+/// The 32-bit field at that offset of the first block. Precondition: it lies within the block.
+std::uint32_t u32At(Bytes blocks, std::size_t offset) {
+    return ByteReader(blocks, false).u32(offset);
+}
+
+constexpr std::size_t lengthOffset = 4;
+constexpr std::size_t capturedOffset = 20;
+
+} // namespace
+
+void appendHead(Buffer& buffer, std::string_view technology) {
+    const auto sectionLength =
+        static_cast<std::uint32_t>(24 + optionSize(application.size()) + optionSize(0) + 4);
+    put32(buffer, BlockType::SectionHeader);
+    put32(buffer, sectionLength);
+    put32(buffer, pcapng::byteOrderMagic);
+    put16(buffer, 1); // format version 1.0
+    put16(buffer, 0);
+    put32(buffer, 0xFFFFFFFF); // the section's length is not known beforehand
+    put32(buffer, 0xFFFFFFFF);
+    putOption(buffer, Option::SectionUserApplication, application);
+    putOption(buffer, Option::End, std::string_view());
+    put32(buffer, sectionLength);
+
+    const auto interfaceLength =
+        static_cast<std::uint32_t>(16 + optionSize(technology.size()) + optionSize(1) + optionSize(0) + 4);
+    put32(buffer, BlockType::InterfaceDescription);
+    put32(buffer, interfaceLength);
+    put16(buffer, pcapng::logMessageLinkType);
+    put16(buffer, 0);
+    put32(buffer, 0); // messages of any length
+    putOption(buffer, Option::InterfaceName, technology);
+    putOption(buffer, Option::TimeResolution, Bytes(&nanosecondResolution, 1));
+    putOption(buffer, Option::End, std::string_view());
+    put32(buffer, interfaceLength);
+}
+
+void appendPacket(Buffer& buffer, Time time, Bytes message) {
+    const auto stamp = static_cast<std::uint64_t>(std::max<std::int64_t>(time.time_since_epoch().count(), 0));
+    const auto size = static_cast<std::uint32_t>(message.size());
+    const auto length = static_cast<std::uint32_t>(packetSize(message.size()));
+    put32(buffer, BlockType::EnhancedPacket);
+    put32(buffer, length);
+    put32(buffer, 0); // the interface
+    put32(buffer, static_cast<std::uint32_t>(stamp >> 32));
+    put32(buffer, static_cast<std::uint32_t>(stamp));
+    put32(buffer, size);
+    put32(buffer, size);
+    putPadded(buffer, message);
+    put32(buffer, length);
+}
+
+std::size_t packetSize(std::size_t messageSize) {
+    return packetOverhead + pcapng::padded(messageSize);
+}
+
+std::size_t completeBlocks(Bytes blocks, std::size_t length) {
+    std::size_t whole = 0;
+    while (whole < blocks.size()) {
+        const std::size_t next = whole + u32At(blocks.subspan(whole), lengthOffset);
+        if (next > length)
+            break;
+        whole = next;
+    }
+    return whole;
+}
+
+PacketCount countPackets(Bytes blocks) {
+    PacketCount count;
+    for (; !blocks.empty(); blocks = blocks.subspan(u32At(blocks, lengthOffset))) {
+        if (u32At(blocks, 0) != BlockType::EnhancedPacket)
+            continue;
+        ++count.messages;
+        count.bytes += u32At(blocks, capturedOffset);
+    }
+    return count;
+}
+
+} // namespace velmora::pcapngBlocks

@@ -1,0 +1,40 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include "Platform/Bytes.h"
+#include "Platform/Clock.h"
+
+#include <cstddef>
+#include <cstdint>
+#include <string_view>
+#include <vector>
+
+/// The blocks of a recording as they are written: little-endian pcapng, one section with one interface (link
+/// type 147, nanoseconds, the technology as its name), then one Enhanced Packet Block a message.
+namespace velmora::pcapngBlocks {
+
+/// Adds the section header and the interface description. Precondition: `technology` has at most 65535 bytes.
+void appendHead(std::vector<std::uint8_t>& buffer, std::string_view technology);
+
+/// Adds a message's block. A time before 1970 cannot be written and becomes 1970-01-01. Precondition: the
+/// message is not above `maximumMessageSize`.
+void appendPacket(std::vector<std::uint8_t>& buffer, Time time, Bytes message);
+
+/// The length of a message's block.
+[[nodiscard]] std::size_t packetSize(std::size_t messageSize);
+
+/// Of blocks as the functions above make them: the length of those that lie wholly within the first `length`
+/// bytes.
+[[nodiscard]] std::size_t completeBlocks(Bytes blocks, std::size_t length);
+
+struct PacketCount {
+    std::uint64_t messages = 0;
+    std::uint64_t bytes = 0; ///< of the messages themselves
+};
+
+/// What such blocks hold.
+[[nodiscard]] PacketCount countPackets(Bytes blocks);
+
+} // namespace velmora::pcapngBlocks

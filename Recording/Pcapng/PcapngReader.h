@@ -1,0 +1,90 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include "Recording/Files/ChunkedInput.h"
+#include "Recording/MessageReader.h"
+#include "Recording/Pcapng/BlockReader.h"
+#include "Recording/Pcapng/InterfaceDescription.h"
+
+#include <cstdint>
+#include <memory>
+#include <optional>
+#include <string>
+#include <utility>
+#include <vector>
+
+namespace velmora {
+
+/// Reads a recording: a pcapng file whose packets, on interfaces of link type 147, are log messages.
+///
+/// Reads what capture tools make of recordings when they cut and merge them: both byte orders, several
+/// sections and interfaces, any time resolution, all three kinds of packet blocks; other blocks are skipped.
+/// An interface's name is its technology. The first one named is the recording's; messages of interfaces
+/// without a name belong to it as well, those of another technology are losses. Interfaces of other link
+/// types are counted and otherwise ignored.
+///
+/// Where a block is damaged, reading resumes at the next block that is not. Memory is bounded whatever the
+/// file holds; a message is a window on the reader's chunk and keeps that alive: copy messages that are kept
+/// for long. A message's number is the packet's place in the file, as capture tools count. Main thread only.
+class PcapngReader final : public MessageReader {
+public:
+    /// What was skipped because it is not a log message.
+    struct PassedOver {
+        std::uint64_t interfaces = 0; ///< of another link type
+        std::uint64_t packets = 0;    ///< on such interfaces
+    };
+
+    /// Opens a file, "-" being standard input, and reads up to its first interface of log messages, or its
+    /// first packet. Fails when it cannot be read or is no pcapng file; the reason does not repeat the path.
+    static Result<std::unique_ptr<PcapngReader>> open(const std::string& path);
+    /// As above, for an input of which nothing has been skipped.
+    static Result<std::unique_ptr<PcapngReader>> open(ChunkedInput input);
+
+    [[nodiscard]] std::optional<LoggedMessage> next() override;
+    [[nodiscard]] const std::string& technology() const override { return _technology; }
+    [[nodiscard]] const std::optional<Failure>& failure() const override { return _blocks.failure(); }
+    [[nodiscard]] const PassedOver& passedOver() const { return _passedOver; }
+
+private:
+    using Block = BlockReader::Block;
+
+    struct Interface {
+        enum class Use : std::uint8_t { Messages, OtherTechnology, OtherLinkType, Unreadable };
+        Use use = Use::Messages;
+        InterfaceDescription description;
+    };
+
+    /// A packet block's fields, whichever of the three kinds it is.
+    struct Packet {
+        std::uint32_t interface = 0;
+        bool hasStamp = false; ///< simple packets have none
+        std::uint64_t stamp = 0;
+        std::size_t offset = 0;     ///< where in the block its bytes begin
+        std::uint32_t captured = 0; ///< bytes in the block
+        std::uint32_t original = 0; ///< bytes of the message
+    };
+
+    explicit PcapngReader(ChunkedInput input) : _blocks(std::move(input)) {}
+
+    [[nodiscard]] const Block* nextBlock();
+    void readBlock(const Block& block);
+    void addInterface(const Block& block);
+    /// Reads a packet's message, unless the packet is ignored or a loss.
+    void readMessage(const Block& block, std::optional<LoggedMessage>& message);
+    [[nodiscard]] Packet packetOf(const Block& block) const;
+    [[nodiscard]] std::string packetProblem(const Packet& packet, const Block& block) const;
+    void addLossOf(const Block& block, std::uint64_t number, std::string reason);
+
+    BlockReader _blocks;
+    const Block* _waiting = nullptr;    ///< the packet that `open` stopped at
+    std::vector<Interface> _interfaces; ///< of the present section
+    bool _foundInterface = false;       ///< an interface of log messages has been read
+    std::string _technology;
+    std::uint64_t _packets = 0; ///< packet blocks read
+    Time _lastTime{};
+    PassedOver _passedOver;
+};
+
+} // namespace velmora
