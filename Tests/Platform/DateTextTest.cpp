@@ -29,7 +29,7 @@ TEST(TimeOfDateDescription, ReadsWhatIsWritten) {
         EXPECT_EQ(timeOfDateDescription(dateDescription(moment)), moment);
 }
 
-TEST(TimeOfDateDescription, GoesByTheZone) {
+TEST(TimeOfDateDescription, UsesTheZone) {
     const Time moment = sys_days{year{2026} / 11 / 16} + 5h;
     EXPECT_EQ(timeOfDateDescription("2026-11-16 06:30:00 +0130"), moment);
     EXPECT_EQ(timeOfDateDescription("2026-11-15 23:30:00 -0530"), moment);
@@ -46,7 +46,7 @@ TEST(TimeOfDateDescription, TakesNothingElse) {
         EXPECT_FALSE(timeOfDateDescription(text)) << text;
 }
 
-TEST(LocalDateAndTime, GoesThroughTheClocksZone) {
+TEST(LocalDateAndTime, UsesTheClocksZone) {
     FakeClock clock;
     clock.setZone({1h, false});
     EXPECT_EQ(localDateAndTime(clock, clock.now(), " at "), "2026-11-16 at 06:00:00");
