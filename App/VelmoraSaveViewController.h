@@ -62,7 +62,7 @@ private:
     [[nodiscard]] bool writeSnapshot(const std::string& path) const;
     void queueClosing();
 
-    /// When the screen was made. This, not the moment of saving, is the snapshot's.
+    /// When the screen was created, which is the snapshot's time, not that of saving.
     Time _timeStamp;
     ArrayRef _saveHistory;
     TableView _saveContentTable;

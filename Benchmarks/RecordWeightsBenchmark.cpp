@@ -72,7 +72,7 @@ ChainErrors measureEverything(const std::vector<Drive>& all, std::size_t count,
 
 std::size_t inventedInNoise(const RecordWeights& weights) {
     std::mt19937_64 random(2);
-    return measureNoise(noiseBytes, RecordChain::Layout::RawMaterial, weights, random).invented +
+    return measureNoise(noiseBytes, RecordChain::Layout::RawMessages, weights, random).invented +
            measureNoise(noiseBytes, RecordChain::Layout::DLF, weights, random).invented;
 }
 

@@ -13,7 +13,7 @@
 namespace velmora {
 
 [[nodiscard]] FuzzCorpus propertyListCorpus();
-/// The words of its XML form, and the mark of the binary one.
+/// The tokens of its XML form, and the signature of the binary one.
 [[nodiscard]] std::vector<Data> propertyListTokens();
 /// Of the technology of that scenario: scripts of its messages.
 [[nodiscard]] FuzzCorpus decoderCorpus(std::string_view scenario);

@@ -24,7 +24,7 @@ namespace velmora {
 /// The day that ten characters such as "2026-11-16" name; none for any other text, and for what is no day of
 /// the calendar.
 [[nodiscard]] std::optional<std::chrono::sys_days> dayOfText(std::string_view text);
-/// The moment that 19 characters such as "2026-11-16T05:00:00" name; hours to 23, minutes and seconds to 59.
+/// The time that 19 characters such as "2026-11-16T05:00:00" denote; hours to 23, minutes and seconds to 59.
 [[nodiscard]] std::optional<std::chrono::sys_seconds> momentOfText(std::string_view text, char separator);
 
 /// The date description: "2026-11-16 05:00:00 +0000", UTC, sortable as text.

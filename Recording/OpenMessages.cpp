@@ -22,7 +22,7 @@ bool startsWith(Bytes bytes, std::string_view text) {
                       [](char c, std::uint8_t byte) { return static_cast<std::uint8_t>(c) == byte; });
 }
 
-/// What a property list begins with: its binary form's mark, or the first words of an XML document.
+/// The start of a property list: the binary form's signature, or the beginning of an XML document.
 bool isPropertyList(Bytes begin) {
     if (startsWith(begin, "\xEF\xBB\xBF"))
         begin = begin.subspan(3);

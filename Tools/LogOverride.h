@@ -13,8 +13,8 @@
 
 namespace velmora {
 
-/// Replaces the process's system log while it lives, at the log's own level; the destructor restores it. The
-/// ones below keep log lines from running into what a command shows on the same terminal.
+/// Replaces the process's system log during its lifetime, at the log's own level; the destructor restores it.
+/// The subclasses keep log lines from mixing with a command's output on the same terminal.
 class LogOverride : public SystemLog {
 public:
     LogOverride();

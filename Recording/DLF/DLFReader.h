@@ -15,11 +15,11 @@ namespace velmora {
 /// logs from elsewhere may lack the report. Messages are returned as they arrived at the port, as far as
 /// the log keeps that (see RecordChain).
 ///
-/// A log keeps no times of arrival: a message has the time of its record's own stamp. For a stamp that is 0
-/// or invalid, the time of the last message before it that had one is used; without one, the time of writing
-/// in the version report; without that, the start of system time, 1980-01-06. Offsets are places in the file,
-/// and records are counted from 1, version reports included. Memory is bounded whatever the file holds; copy
-/// messages that are kept for long. Main thread only.
+/// A log has no arrival times: a message has the time of its record's own stamp. For a stamp that is 0 or
+/// invalid, the time of the last message before it that had one is used; without one, the time of writing in
+/// the version report; without that, the start of system time, 1980-01-06. Offsets are from the file's start,
+/// and records are counted from 1, version reports included. Memory is bounded for any content; copy messages
+/// that are kept for long. Main thread only.
 class DLFReader final : public RecordChainReader {
 public:
     /// Opens an input of which nothing has been skipped, and looks ahead for its technology. Fails when it

@@ -172,10 +172,10 @@ void RecordChain::skipDamage(const Survey& survey) {
         loss.reason = "record length " + std::to_string(header->length) + " does not lead to another record";
     else
         loss.reason = "no log record";
-    // Raw material is whole; a log's writer may have stopped in the middle of a record.
+    // Raw messages are complete; a log's writer may have stopped in the middle of a record.
     loss.isTruncation =
         !found && (isShort || survey.truncated) && _layout == Layout::DLF && !_input.failure();
-    if (_loss) // two stretches of one damage
+    if (_loss) // two segments of the same damage
         _loss->bytes += loss.bytes;
     else
         _loss = std::move(loss);

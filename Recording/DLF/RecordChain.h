@@ -16,20 +16,19 @@
 
 namespace velmora {
 
-/// Log records one after the other with nothing between them, split by the length field of each: the raw
-/// material of a display, or a DLF log. Returns each as the message that arrived at the port.
+/// Log records without gaps, split by their length fields: the raw messages of a display, or a DLF log.
+/// Returns each as the message that arrived at the port.
 ///
-/// In raw material a message begins with its type byte, or with two bytes of prefix before that, and its
+/// In raw messages a message begins with its type byte, or with two bytes of prefix before that, and its
 /// length counts what follows the type. A DLF log has records without type byte; those in the middle of one
 /// of the application's buffers still have theirs, and their prefix; a prefixed record at a buffer's
-/// beginning has only the prefix's second byte and the type left. Nothing in the log says which of these a
-/// record is: the reading with the most score is taken (RecordCandidate), from its type byte, code and
-/// time stamp and from what follows where it ends. A type byte that is missing is restored from the code
-/// (impliedType).
+/// beginning has only the prefix's second byte and the type left. Nothing in the log marks which of these a
+/// record is: the candidate with the highest score is chosen (RecordCandidate), from its type byte, code and
+/// time stamp and from what follows it. A type byte that is missing is restored from the code (impliedType).
 ///
-/// Where no record leads to another one, reading resumes at the next place where one surely does. The
+/// Where no record leads to another one, reading resumes at the next offset where one reliably does. The
 /// look-ahead is at most about 200 KB, damage of any length is skipped in bounded memory, and time is
-/// proportional to the input's size whatever it holds. Main thread only.
+/// proportional to the input's size for any content. Main thread only.
 class RecordChain {
 public:
     enum class Layout : std::uint8_t { RawMessages, DLF };
@@ -57,7 +56,7 @@ public:
     [[nodiscard]] const std::optional<Failure>& failure() const { return _input.failure(); }
 
 private:
-    /// What the bytes at hand may be.
+    /// The candidates at the current bytes.
     struct Survey {
         std::optional<RecordCandidate> linked;    ///< ends where another record begins, or the input ends
         std::optional<RecordCandidate> plain;     ///< has the score of a record itself
@@ -79,7 +78,7 @@ private:
     Layout _layout;
     RecordWeights _weights;
     std::size_t _present = 0;                ///< size of the record that `next` last returned
-    std::optional<std::uint64_t> _timestamp; ///< the last good one
+    std::optional<std::uint64_t> _timestamp; ///< the last valid one
     std::optional<Loss> _loss;
 };
 

@@ -20,12 +20,12 @@ namespace velmora {
 ///
 /// The bytes lie in chunks. `part` returns a window on the chunk itself: it stays valid after the input has
 /// moved on, but keeps its whole chunk in memory; copy a part that is kept for long. A chunk without
-/// references is reused. Chunks have the given size, except where one look-ahead asks for more: then they
-/// grow with the bytes that arrive, up to about twice what it asked for. Main thread only.
+/// references is reused. Chunks have the given size, except where one look-ahead requests more: then they
+/// grow with the bytes that arrive, up to about twice that. Main thread only.
 class ChunkedInput {
 public:
-    /// Two of them come to much less than a mebibyte, so that the second, which is made once the first has
-    /// been read through, is no growth to speak of; larger ones are not read faster.
+    /// Two of them are much less than a mebibyte, so that the second, which is allocated after the first has
+    /// been read, is negligible growth; larger ones are not read faster.
     static constexpr std::size_t defaultChunkSize = std::size_t{256} << 10;
 
     explicit ChunkedInput(std::unique_ptr<ByteSource> source, std::size_t chunkSize = defaultChunkSize);

@@ -15,8 +15,8 @@
 namespace velmora {
 
 /// Splits a pcapng file into its blocks. Where a block is damaged, resumes at the next one that is not:
-/// blocks lie on 4-byte boundaries, but a section header is looked for at every byte, so that a recording
-/// appended to one that was cut off is found. Main thread only.
+/// blocks lie on 4-byte boundaries, but section headers are searched at every byte, so that a recording
+/// appended to a truncated one is found. Main thread only.
 class BlockReader {
 public:
     struct Block {

@@ -137,7 +137,7 @@ void PcapngReader::readMessage(const Block& block, std::optional<LoggedMessage>&
     if (interface != nullptr && interface->use == Use::Messages && whole)
         time = packet.hasStamp ? interface->description.time(packet.stamp) : _lastTime;
     if (!time) {
-        // Thousands of these are possible; only those that are kept need their words.
+        // Thousands of these are possible; only those that are kept need a reason.
         addLossOf(block, number, keepsLoss() ? packetProblem(packet, block) : std::string());
         return;
     }

@@ -19,15 +19,15 @@ namespace velmora {
 
 /// Reads a recording: a pcapng file whose packets, on interfaces of link type 147, are log messages.
 ///
-/// Reads what capture tools make of recordings when they cut and merge them: both byte orders, several
-/// sections and interfaces, any time resolution, all three kinds of packet blocks; other blocks are skipped.
-/// An interface's name is its technology. The first one named is the recording's; messages of interfaces
-/// without a name belong to it as well, those of another technology are losses. Interfaces of other link
-/// types are counted and otherwise ignored.
+/// Reads recordings also after capture tools have cut and merged them: both byte orders, several sections and
+/// interfaces, any time resolution, all three kinds of packet blocks; other blocks are skipped. An
+/// interface's name is its technology. The first one named is the recording's; messages of interfaces without
+/// a name belong to it as well, those of another technology are losses. Interfaces of other link types are
+/// counted and otherwise ignored.
 ///
-/// Where a block is damaged, reading resumes at the next block that is not. Memory is bounded whatever the
-/// file holds; a message is a window on the reader's chunk and keeps that alive: copy messages that are kept
-/// for long. A message's number is the packet's place in the file, as capture tools count. Main thread only.
+/// Where a block is damaged, reading resumes at the next block that is not. Memory is bounded for any
+/// content; a message is a window on the reader's chunk and keeps that alive: copy messages that are kept for
+/// long. A message's number is the packet's in the file, as capture tools count. Main thread only.
 class PcapngReader final : public MessageReader {
 public:
     /// What was skipped because it is not a log message.

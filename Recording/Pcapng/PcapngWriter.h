@@ -19,16 +19,16 @@
 
 namespace velmora {
 
-/// Writes a recording (see PcapngBlocks.h). Messages are buffered and written as whole blocks, so that a
-/// writer that is killed loses the last ones and cuts at most one. Call `flush` where a reader waits at the
+/// Writes a recording (see PcapngBlocks.h). Messages are buffered and written as complete blocks, so that a
+/// killed writer loses the last ones and truncates at most one. Call `flush` where a reader waits at the
 /// other end, `sync` at regular intervals where the recording must survive a power failure.
 ///
-/// Failures of a regular file may be temporary: a full disk or quota, a limit on the file's size, a medium
-/// that fails or is read-only at the moment. A temporary failure loses nothing by itself: the file is cut
-/// back to its last whole block and up to 32 MiB of messages are queued; once the queue is full, further
-/// messages are dropped until the failure is over, so that there is one gap and not many. Until then every
-/// call returns the failure, and each `flush` and `sync` retries. After a permanent failure every call
-/// returns it and nothing more is written. `hasTemporaryError` says which of the two it is.
+/// Failures of a regular file may be temporary: a full disk or quota, a limit on the file's size, storage
+/// that fails or is currently read-only. A temporary failure alone loses nothing: the file is truncated to
+/// its last complete block and up to 32 MiB of messages are queued; once the queue is full, further messages
+/// are dropped until the failure is over, so that there is one gap and not many. Until then every call
+/// returns the failure, and each `flush` and `sync` retries. After a permanent failure every call returns it
+/// and nothing more is written. `hasTemporaryError` distinguishes the two.
 ///
 /// Owns its file; destroying it closes it as `close` does, but reports no failure. Main thread only.
 class PcapngWriter {

@@ -58,7 +58,7 @@ inline constexpr std::int64_t UMTS = 3;
 inline constexpr std::int64_t LTE = 5;
 } // namespace CellType
 
-/// The bit and, in the answer of GetLocation, the key of the place in the network.
+/// The bit and, in the answer of GetLocation, the key of the location in the network.
 inline constexpr std::string_view location3gppKey = "1";
 
 } // namespace velmora::mm

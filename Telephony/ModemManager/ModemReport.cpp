@@ -23,7 +23,7 @@ struct RadioKind {
     MemberOf signal;
     std::string_view signalMember;
 };
-// In order of their generation: a modem that is on several of them at once shows its place on the last.
+// In order of their generation: a modem on several of them at once reports its location in the last.
 constexpr RadioKind radioKinds[] = {
     {mm::CellType::GSM, mm::Access::GSM, kVoxCellMonitorRadioAccessTechnologyGSM, MemberOf::GSMCell,
      MemberOf::CSLocation, MemberOf::GSMSignal, "Gsm"},

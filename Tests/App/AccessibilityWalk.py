@@ -1,6 +1,6 @@
 # SPDX-FileCopyrightText: 2026 Velmora contributors
 # SPDX-License-Identifier: MIT
-"""Uses the application as somebody with a screen reader does, from outside, through the accessibility tree.
+"""Uses the application as a screen reader does: from another process, through the accessibility tree.
 
 The real service and the real application run as processes. The walk goes two panes down and back, saves a
 snapshot, sees the service die and come back, and ends the application.

@@ -45,7 +45,7 @@ bool isFollowable(const Data& message) {
 bool lacksFirstByte(const Data& message, std::size_t index, ChainForm form) {
     const auto parsed = LogMessage::parse(message.bytes());
     switch (form) {
-    case ChainForm::RawMaterial: return false;
+    case ChainForm::RawMessages: return false;
     // A type that a reader cannot put back is damage, which is not to be counted here.
     case ChainForm::ApplicationLog:
         return index % bufferLength == 0 && (parsed->prefixed || parsed->type == impliedType(parsed->code));
@@ -137,7 +137,7 @@ static ChainErrors measureOne(Chain chain, ChainForm form, ChainDamage damage, c
     errors.damages = damage == ChainDamage::None ? 0 : 1;
     errors.untouched = untouched.size();
     const auto layout =
-        form == ChainForm::RawMaterial ? RecordChain::Layout::RawMaterial : RecordChain::Layout::DLF;
+        form == ChainForm::RawMessages ? RecordChain::Layout::RawMessages : RecordChain::Layout::DLF;
     RecordChain reader(ChunkedInput(std::make_unique<DataSource>(Data(std::move(chain.bytes)))), layout,
                        weights);
     while (const std::optional<RecordChain::Record> record = reader.next()) {

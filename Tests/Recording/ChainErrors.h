@@ -18,11 +18,11 @@
 namespace velmora {
 
 enum class ChainForm : std::uint8_t {
-    RawMaterial,    ///< messages as they arrived
+    RawMessages,    ///< messages as they arrived
     ApplicationLog, ///< a DLF log as the application writes it: the first byte of each buffer is missing
     CompactLog,     ///< a DLF log as DLFWriter writes it: most records lack their type byte
 };
-inline constexpr ChainForm everyChainForm[] = {ChainForm::RawMaterial, ChainForm::ApplicationLog,
+inline constexpr ChainForm everyChainForm[] = {ChainForm::RawMessages, ChainForm::ApplicationLog,
                                                ChainForm::CompactLog};
 
 enum class ChainDamage : std::uint8_t {

@@ -42,32 +42,32 @@ Data recordsOf(std::initializer_list<std::uint16_t> codes, int rounds) {
 }
 
 TEST(DLFTechnology, recognisesTheTechnologyByItsLogCodes) {
-    struct Told {
+    struct Log {
         const char* name;
         Data records;
         const char* technology;
     };
-    const Told files[] = {
+    const Log files[] = {
         {"each technology's own codes: GSM", recordsOf({0x512C}, 1), "Ostrel_GSM"},
         {"LTE", recordsOf({0xB0C1}, 1), "Ostrel_LTE"},
         {"UTRAN", recordsOf({0xD00A}, 1), "Ostrel_UTRAN2"},
         {"CDMA", recordsOf({0x1183}, 1), "Ostrel_CDMA"},
-        {"nobody's code", recordsOf({0x1375}, 5), ""},
+        {"a code of no technology", recordsOf({0x1375}, 5), ""},
         {"several technologies' codes alone", recordsOf({0x0001, 0x0002}, 5), ""},
         {"several technologies' codes, and one's own at the end",
          joined(recordsOf({0x0001}, 50), recordsOf({0xD0E0}, 1)), "Ostrel_UTRAN2"},
         {"most messages decide", recordsOf({0x512C, 0xB17F, 0xB180}, 2), "Ostrel_LTE"},
         {"as many of two", recordsOf({0x512C, 0xB17F}, 2), ""},
         {"within 1000 messages", joined(recordsOf({0x1375}, 999), recordsOf({0xB17F}, 1)), "Ostrel_LTE"},
-        {"not behind them", joined(recordsOf({0x1375}, 1000), recordsOf({0xB17F}, 1)), ""},
+        {"not after them", joined(recordsOf({0x1375}, 1000), recordsOf({0xB17F}, 1)), ""},
         {"three ahead is enough", joined(recordsOf({0x512C}, 3), recordsOf({0xB17F}, 100)), "Ostrel_GSM"},
     };
-    for (const Told& each : files) {
+    for (const Log& each : files) {
         auto reader = DLFReader::open(ChunkedInput(std::make_unique<MemorySource>(each.records)));
         ASSERT_TRUE(reader) << each.name << ": " << reader.reason();
         EXPECT_EQ((*reader)->technology(), each.technology) << each.name;
         EXPECT_EQ((*reader)->form(), "DLF log");
-        // What was looked at comes all the same, in its order.
+        // The messages of the look-ahead are returned as well, in order.
         std::uint64_t number = 0;
         while (const auto message = (*reader)->next())
             EXPECT_EQ(message->number, ++number);

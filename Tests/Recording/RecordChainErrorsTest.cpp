@@ -50,7 +50,7 @@ TEST_P(RecordChainErrors, areRareWithDamage) {
     for (const ChainForm form : everyChainForm) {
         for (const ChainDamage damage : everyChainDamage) {
             const ChainErrors errors = measure(form, damage, count, {});
-            const std::size_t bound = form == ChainForm::RawMaterial ? count / 25 : 2 * count / 5;
+            const std::size_t bound = form == ChainForm::RawMessages ? count / 25 : 2 * count / 5;
             EXPECT_LE(errors.errors(), bound) << static_cast<int>(form) << " " << static_cast<int>(damage);
         }
     }
@@ -84,7 +84,7 @@ INSTANTIATE_TEST_SUITE_P(Recordings, RecordChainErrors, testing::Values("gsm", "
 
 TEST(RecordChainInNoise, findsNoRecord) {
     std::mt19937_64 random(1);
-    for (const auto layout : {RecordChain::Layout::RawMaterial, RecordChain::Layout::DLF})
+    for (const auto layout : {RecordChain::Layout::RawMessages, RecordChain::Layout::DLF})
         EXPECT_EQ(measureNoise(std::size_t{1} << 18, layout, {}, random).invented, 0U);
 }
 
@@ -93,7 +93,7 @@ TEST(RecordChainInNoise, findsRecordsWhereTheThresholdIsLow) {
     std::mt19937_64 random(1);
     RecordWeights weights;
     weights.sure = 4;
-    EXPECT_GT(measureNoise(std::size_t{1} << 18, RecordChain::Layout::RawMaterial, weights, random).invented,
+    EXPECT_GT(measureNoise(std::size_t{1} << 18, RecordChain::Layout::RawMessages, weights, random).invented,
               0U);
 }
 

@@ -21,7 +21,7 @@ TEST_F(LogServerTest, makesAChannel) {
     EXPECT_EQ(ports.connectionCount("app"), 1U);
     EXPECT_EQ(createChannel("other"), "com.velmora.vox.server.channel.2");
     EXPECT_EQ(server.channelCount(), 2U);
-    EXPECT_EQ(source.starts, 0) << "nobody streams yet";
+    EXPECT_EQ(source.starts, 0) << "no client streams yet";
     EXPECT_THAT(errors(), IsEmpty());
 }
 

@@ -20,8 +20,8 @@ public:
     [[nodiscard]] Toolbar& toolbar() { return *_toolbar; }
     void setToolbarHidden(bool isHidden);
 
-    /// Puts the pane in the old one's place (there may be none): from the right when it is pushed, uncovered
-    /// from the left otherwise. An earlier movement ends first.
+    /// Replaces the old pane (there may be none): sliding in from the right for a push, uncovered from the
+    /// left otherwise. An earlier animation ends first.
     void showPane(View& pane, View* old, bool isPush, bool animated, std::function<void()> atEnd);
     /// Leaves the pane area empty.
     void removePane();

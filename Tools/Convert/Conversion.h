@@ -36,8 +36,8 @@ struct Conversion {
     std::string name;        ///< of the output
     std::string technology;  ///< overrides the input's; empty for the input's
     std::string description; ///< a snapshot's
-    /// How many refreshes the input takes (see countRefreshes), where it could be read before: a snapshot
-    /// needs the history of the last of them only, which makes it a good deal faster.
+    /// The input's number of refreshes (see countRefreshes), if it could be read twice: a snapshot needs the
+    /// history of the last of them only, and skipping the rest is much faster.
     std::optional<std::uint64_t> refreshes;
 };
 

@@ -58,7 +58,7 @@ private:
     std::optional<DecodeProgress> _progress;
 };
 
-/// Decodes one file and prints it. Whether its input was good.
+/// Decodes one file and prints it. Returns whether all of it was read.
 bool decodeFile(std::size_t index, const DecodeOptions& options, bool showsProgress, Output& output) {
     const std::string& path = options.files[index];
     const std::string title = fileTitle(path);

@@ -59,10 +59,9 @@ CLI::App* addDecode(CLI::App& app, DecodeOptions& options) {
                                  : name == "csv"   ? Format::Csv
                                                    : Format::Text;
             },
-            "text (the default): the final display as a tree; json: one object with the technology, the "
-            "number "
-            "of messages and the final display; jsonl: such an object with its time for each refresh, one a "
-            "line; csv: a row for each refresh, a column for each --select")
+            "text (the default): the final display as a tree; json: one object with the technology, "
+            "the number of messages and the final display; jsonl: such an object with its time for each "
+            "refresh, one a line; csv: a row for each refresh, a column for each --select")
         ->check(oneOf({"text", "json", "jsonl", "csv"}))
         ->type_name("text|json|jsonl|csv");
     command
@@ -80,9 +79,8 @@ CLI::App* addDecode(CLI::App& app, DecodeOptions& options) {
         ->add_option_function<std::vector<std::string>>(
             "--select",
             [&options](const std::vector<std::string>& paths) { options.selection = NodeSelection(paths); },
-            "Only this part of the display, by a path of the names on the screens: \"/GSM/GSM Serving "
-            "Cell/RSSI\", "
-            "\"/GSM/Neighboring Cells/0\"; may be repeated")
+            "Only this part of the display, by a path of the names on the screens: "
+            "\"/GSM/GSM Serving Cell/RSSI\", \"/GSM/Neighboring Cells/0\"; may be repeated")
         ->check(validator(NodeSelection::isPath, "a path that begins with a slash"))
         ->expected(1)
         ->allow_extra_args(false) // a FILE may follow

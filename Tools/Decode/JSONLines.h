@@ -44,7 +44,7 @@ private:
 
     std::string _begin;
     Time _moment{};
-    std::string_view _end; ///< what ends the line at hand
+    std::string_view _end; ///< the end of the current line
     bool _first = true;    ///< no member of it so far
 };
 

@@ -30,8 +30,7 @@ std::optional<Time> RefreshTicks::last() const {
 
 /// Precondition: `_next` is not after the message.
 void RefreshTicks::advancePast(Time message) {
-    // Unsigned, since the span between two moments may be more than a signed 64-bit count of nanoseconds
-    // holds.
+    // Unsigned, since the span between two times can exceed a signed 64-bit count of nanoseconds.
     const auto distance = [](Time from, Time to) {
         return static_cast<std::uint64_t>(to.time_since_epoch().count()) -
                static_cast<std::uint64_t>(from.time_since_epoch().count());

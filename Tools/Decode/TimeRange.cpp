@@ -64,7 +64,7 @@ public:
         return nanoseconds(scaled);
     }
 
-    /// Digits, with a fraction or not. None for more than a moment's range needs.
+    /// Digits with an optional fraction. Absent if they exceed the range of Time.
     std::optional<nanoseconds> seconds() {
         constexpr std::size_t mostDigits = 10;
         const std::size_t count = digitCount();

@@ -33,7 +33,7 @@ constexpr std::array<bool, 256> plainBytes = []() {
     return plain;
 }();
 
-/// Eight bytes at a time: nearly all of what is written is plain, and in pieces of some ten bytes.
+/// Eight bytes at a time: nearly all text is plain, in segments of some ten bytes.
 using Word = std::uint64_t;
 
 /// Whether a byte of the word is not plain. The tests for zero and for less may also flag a byte above one

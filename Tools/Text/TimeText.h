@@ -11,7 +11,7 @@
 
 namespace velmora {
 
-/// Writes moments as "2026-11-16T05:00:00.000000000Z" (RFC 3339, UTC, always nine digits of fraction, so that
+/// Writes times as "2026-11-16T05:00:00.000000000Z" (RFC 3339, UTC, always nine digits of fraction, so that
 /// they sort as text). Caches the day's text: the calendar is the expensive part.
 class TimeText {
 public:

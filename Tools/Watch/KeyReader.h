@@ -12,7 +12,7 @@ namespace velmora {
 /// A key that means something to the screen.
 enum class Key { Up, Down, PageUp, PageDown, Home, End, Quit };
 
-/// Reads keys from the bytes that a terminal sends for them. Sequences may come in pieces; unknown ones are
+/// Reads keys from the bytes that a terminal sends for them. Sequences may arrive in parts; unknown ones are
 /// skipped.
 class KeyReader {
 public:

@@ -52,7 +52,7 @@ class Laboratory:
         return Outcome.SURVIVED
 
     def _objects(self, path: str, program: str, all_users: bool) -> Iterator[str]:
-        """The objects to compile anew for a test program. Without optimization the linker takes an inline
+        """The objects to recompile for a test program. Without optimization the linker takes an inline
         function from the first object that has it; so those are mostly enough that include the file directly
         or are decoders, since others use only what is computed when they are compiled."""
         linked = set(self.graph.links[program])

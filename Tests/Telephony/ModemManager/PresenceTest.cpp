@@ -221,7 +221,7 @@ TEST_F(PresenceTest, aChangedTechnologyIsReported) {
     becomes(lteAccess | nrAccess);
     EXPECT_EQ(source->technology(), lte);
     EXPECT_EQ(changes, 3);
-    EXPECT_THAT(sink.messages, IsEmpty()) << "nobody listens";
+    EXPECT_THAT(sink.messages, IsEmpty()) << "no client listens";
 }
 
 TEST_F(PresenceTest, rubbishOfTheObjectManagerIsNoModem) {

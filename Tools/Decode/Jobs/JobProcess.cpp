@@ -34,7 +34,7 @@ Pipe openPipe() {
     return {FileDescriptor(ends[0]), FileDescriptor(ends[1])};
 }
 
-/// Reads what is there. None where there is nothing at the moment; empty at the end.
+/// Reads the available bytes. Absent if there are none yet; empty at the end.
 std::optional<std::string_view> readPiece(int descriptor, std::vector<char>& buffer) {
     const ssize_t count = ::read(descriptor, buffer.data(), buffer.size());
     if (count < 0 && (errno == EINTR || errno == EAGAIN))

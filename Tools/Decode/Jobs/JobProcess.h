@@ -20,8 +20,8 @@ namespace velmora {
 
 class Output;
 
-/// Does one piece of work into an output; returns whether its input was good. May end the process, as
-/// decoders do.
+/// Runs one job, which writes to the output; returns whether its input was read without losses. May end the
+/// process, as decoders do.
 using Job = std::function<bool(std::size_t index, Output& output)>;
 
 /// Where the output and the errors of the job that is first in line go.
