@@ -112,8 +112,8 @@ protected:
 
     /// "Record 0x5137: 2 of 3 entries", where the record holds fewer than its count announces.
     static void reportMissingEntries(const CountedList& list, std::uint32_t logCode);
-    /// The same for a list whose entries' lengths differ: `whole` of `count` lie inside the record.
-    static void reportMissingEntries(std::size_t whole, std::size_t count, std::uint32_t logCode);
+    /// The same for a list whose entries' lengths differ: `complete` of `count` lie inside the record.
+    static void reportMissingEntries(std::size_t complete, std::size_t count, std::uint32_t logCode);
     /// The error line for a code that the section does not handle.
     static void unknownLogMessage(std::uint32_t logCode);
 
@@ -132,12 +132,12 @@ private:
     template <class Node>
     class WatchedNode {
     public:
-        void refer(const std::shared_ptr<Node>& node) {
+        void assign(const std::shared_ptr<Node>& node) {
             _watch = node;
             _node = node.get();
         }
         [[nodiscard]] Node* get() const { return _watch.expired() ? nullptr : _node; }
-        [[nodiscard]] std::shared_ptr<Node> share() const { return _watch.lock(); }
+        [[nodiscard]] std::shared_ptr<Node> lock() const { return _watch.lock(); }
 
     private:
         std::weak_ptr<Node> _watch;

@@ -26,10 +26,10 @@ public:
 
     struct Kept {
         std::vector<std::uint8_t> bytes;
-        std::uint64_t turn = 0; ///< the place in the order of arrival; 0 when there is nothing to write
-        Parts parts = 0;        ///< of the record that is kept
-        Parts shown = 0;        ///< of all that have been written
-        [[nodiscard]] bool isPending() const { return turn != 0; }
+        std::uint64_t order = 0; ///< the place in the order of arrival; 0 when there is nothing to write
+        Parts parts = 0;         ///< of the record that is kept
+        Parts shown = 0;         ///< of all that have been written
+        [[nodiscard]] bool isPending() const { return order != 0; }
     };
 
     explicit KeptRecords(std::size_t views = 0) : _kept(views) {}
@@ -45,7 +45,7 @@ public:
     [[nodiscard]] bool keep(std::size_t view, Bytes bytes, Parts parts);
     /// Nothing is pending but, perhaps, this view: it replaces what the others would write.
     void dropAllBut(std::size_t view);
-    void drop(std::size_t view) { _kept[view].turn = 0; }
+    void drop(std::size_t view) { _kept[view].order = 0; }
     /// Nothing is pending, and nothing has been written: the display is another.
     void clear();
 
@@ -56,7 +56,7 @@ public:
         for (std::size_t view = earliest(); view != none; view = earliest()) {
             Kept& kept = _kept[view];
             write(view, Bytes(kept.bytes));
-            kept.turn = 0;
+            kept.order = 0;
             kept.shown |= kept.parts;
         }
     }
@@ -67,7 +67,7 @@ private:
     [[nodiscard]] std::size_t earliest() const;
 
     std::vector<Kept> _kept;
-    std::uint64_t _turns = 0;
+    std::uint64_t _lastOrder = 0;
 };
 
 } // namespace velmora

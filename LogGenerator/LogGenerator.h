@@ -31,7 +31,7 @@ public:
     /// Decodes one log message into the state. Called for every message.
     virtual void updateState(Dictionary& state, const Data& data) = 0;
     /// `updateState`, and reports what the message concerned. The default reports the entire display.
-    virtual void updateStateTelling(Dictionary& state, const Data& data, MessageEffects& effects);
+    virtual void updateStateReporting(Dictionary& state, const Data& data, MessageEffects& effects);
     /// The display for the current state, or none when there is nothing to show yet; appends a history entry.
     /// Called once per redraw with new data.
     [[nodiscard]] virtual Value generateLogUsingState(Dictionary& state) = 0;

@@ -64,7 +64,7 @@ ArrayRef OstrelLogGenerator::getSaveContentsFromState(const Dictionary& state) c
     return contents;
 }
 
-void OstrelLogGenerator::keepRefresh(Dictionary& state) {
+void OstrelLogGenerator::endRefresh(Dictionary& state) {
     if (!keepsHistory())
         return;
     const std::size_t usual = _binData.size();

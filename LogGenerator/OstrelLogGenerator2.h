@@ -28,7 +28,7 @@ public:
 
     void updateState(Dictionary& state, const Data& data) override;
     /// Reports the subscribers of the message's code.
-    void updateStateTelling(Dictionary& state, const Data& data, MessageEffects& effects) override;
+    void updateStateReporting(Dictionary& state, const Data& data, MessageEffects& effects) override;
     [[nodiscard]] Value generateLogUsingState(Dictionary& state) override;
     [[nodiscard]] Value display(Dictionary& state) override;
     [[nodiscard]] DictionaryRef getStartCommand() const override;
@@ -54,11 +54,11 @@ private:
     /// Does what `updateWithData` does. Gives the code; none for a message that was dropped.
     std::optional<std::uint32_t> route(const Data& message);
     /// Gives the sections of this decoder their nodes of a display that an earlier decoder built.
-    void adoptDisplay(const Value& object);
+    void attachSections(const Value& object);
 
     std::string pListName;
     std::shared_ptr<ClassIndex> cIndex;
-    bool _sectionsHaveNodes = false;
+    bool _sectionsAttached = false;
 };
 
 } // namespace velmora

@@ -95,7 +95,7 @@ void C2KLogGenerator::updateState(Dictionary& state, const Data& data) {
     update(state, data, nullptr);
 }
 
-void C2KLogGenerator::updateStateTelling(Dictionary& state, const Data& data, MessageEffects& effects) {
+void C2KLogGenerator::updateStateReporting(Dictionary& state, const Data& data, MessageEffects& effects) {
     update(state, data, &effects);
 }
 
@@ -129,13 +129,13 @@ void C2KLogGenerator::updateFromLog(const Data& data, const DictionaryRef& looku
         _readings.use(lookup);
         _readings.keep(*parser, *reading);
     }
-    keep(message->prefixed ? data.from(LogMessage::prefixLength) : data);
+    keepMessage(message->prefixed ? data.from(LogMessage::prefixLength) : data);
 }
 
 Value C2KLogGenerator::generateLogUsingState(Dictionary& state) {
     _readings.write();
     Value display = getDisplayFromState(state);
-    keepRefresh(state);
+    endRefresh(state);
     return display;
 }
 

@@ -28,7 +28,7 @@ public:
     [[nodiscard]] DictionaryRef getStartCommand() const override;
     void updateState(Dictionary& state, const Data& data) override;
     /// Tells of the values that the message published.
-    void updateStateTelling(Dictionary& state, const Data& data, MessageEffects& effects) override;
+    void updateStateReporting(Dictionary& state, const Data& data, MessageEffects& effects) override;
     [[nodiscard]] Value generateLogUsingState(Dictionary& state) override;
     [[nodiscard]] Value display(Dictionary& state) override;
 

@@ -15,7 +15,7 @@ namespace velmora::C2K {
 [[nodiscard]] std::span<const LogCodeParser* const> logCodeParsers();
 
 /// The place of a parser among them.
-[[nodiscard]] std::size_t placeOf(const LogCodeParser& parser);
+[[nodiscard]] std::size_t indexOf(const LogCodeParser& parser);
 
 /// The parser of that code; null when there is none.
 [[nodiscard]] const LogCodeParser* parserOfCode(std::uint32_t logCode);

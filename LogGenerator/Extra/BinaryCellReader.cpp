@@ -106,8 +106,8 @@ private:
     [[nodiscard]] bool hasReferences(const Object& container, std::size_t anEntry) const {
         return container.count <= (_table - container.content) / (anEntry * _referenceWidth);
     }
-    [[nodiscard]] std::size_t reference(const Object& container, std::size_t place) const {
-        return static_cast<std::size_t>(number(container.content + place * _referenceWidth, _referenceWidth));
+    [[nodiscard]] std::size_t reference(const Object& container, std::size_t index) const {
+        return static_cast<std::size_t>(number(container.content + index * _referenceWidth, _referenceWidth));
     }
 
     bool text(const Object& object, std::string_view& text) const {
@@ -138,7 +138,7 @@ private:
         std::string_view keyText;
         if (!object(index, key) || !text(key, keyText))
             return false;
-        meaning = placeOf(keyText, cellNumberKeys);
+        meaning = indexOf(keyText, cellNumberKeys);
         if (keyText == kVoxCellMonitorCellRadioAccessTechnology)
             meaning = technologyKey;
         else if (keyText == kVoxCellMonitorCellType)
@@ -173,7 +173,7 @@ private:
             if (kind.object != valueIndex) {
                 if (!text(value, valueText))
                     return false;
-                kind = {valueIndex, placeOf(valueText, cellTechnologies), placeOf(valueText, cellTypes)};
+                kind = {valueIndex, indexOf(valueText, cellTechnologies), indexOf(valueText, cellTypes)};
             }
             (key == technologyKey ? cell.kind.technology : cell.kind.type) =
                 key == technologyKey ? kind.technology : kind.type;
@@ -182,7 +182,7 @@ private:
         if (!text(value, valueText))
             return false;
         if (key < cellNumberCount)
-            cell.setNoNumber(key);
+            cell.clearNumber(key);
         return true;
     }
 

@@ -22,12 +22,12 @@ public:
 
     /// As long as it lives, every call of `read` is for one and the same record, so that it need not be
     /// compared with the last.
-    class OneRecord {
+    class SameRecordScope {
     public:
-        explicit OneRecord(CellList& cells) : _cells(cells) { _cells._isOneRecord = true; }
-        ~OneRecord() { _cells._isOneRecord = _cells._isRead = false; }
-        OneRecord(const OneRecord&) = delete;
-        OneRecord& operator=(const OneRecord&) = delete;
+        explicit SameRecordScope(CellList& cells) : _cells(cells) { _cells._isSameRecord = true; }
+        ~SameRecordScope() { _cells._isSameRecord = _cells._isRead = false; }
+        SameRecordScope(const SameRecordScope&) = delete;
+        SameRecordScope& operator=(const SameRecordScope&) = delete;
 
     private:
         CellList& _cells;
@@ -35,12 +35,12 @@ public:
 
 private:
     [[nodiscard]] bool readPayload(const Data& record);
-    [[nodiscard]] bool readSlowly(const Data& record);
+    [[nodiscard]] bool readAsPropertyList(const Data& record);
 
     std::vector<std::uint8_t> _payload; ///< that `_cells` were read from; empty before
     std::vector<Cell> _cells;
     XMLCellReader _xmlReader;
-    bool _isOneRecord = false;
+    bool _isSameRecord = false;
     bool _isRead = false; ///< the one record has been
 };
 

@@ -21,7 +21,7 @@ namespace velmora {
 
 /// A cache of a section's latest payloads and their values. The SIM's files and the contexts are sent
 /// repeatedly without having changed, or as before, alternately in both forms: some of them are cached.
-class RememberedPayloads {
+class PayloadCache {
 public:
     /// What the record's payload holds, as readPropertyList gives it.
     [[nodiscard]] Result<Value> read(const Data& record);
@@ -49,7 +49,7 @@ public:
 class SIMFileReader {
 public:
     /// Logs and raises UnknownDataException when the payload cannot be read.
-    SIMFileReader(const Data& record, RememberedPayloads& earlier);
+    SIMFileReader(const Data& record, PayloadCache& earlier);
     /// The value under `key`; null when there is none.
     [[nodiscard]] const Value* value(std::string_view key) const;
     /// What the payload holds, whatever its kind.
@@ -64,7 +64,7 @@ private:
 /// The packet-data contexts: an array, or nothing where the payload is anything else or unreadable.
 class ContextListReader {
 public:
-    ContextListReader(const Data& record, RememberedPayloads& earlier);
+    ContextListReader(const Data& record, PayloadCache& earlier);
     [[nodiscard]] const Value& contexts() const { return _contexts; }
 
 private:

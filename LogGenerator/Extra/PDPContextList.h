@@ -20,7 +20,7 @@ public:
 private:
     void trace() const override;
 
-    RememberedPayloads _payloads;
+    PayloadCache _payloads;
     Value _contexts; ///< of the record that is kept: an array
 };
 

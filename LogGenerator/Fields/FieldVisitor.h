@@ -49,7 +49,7 @@ public:
     /// A list of one row for each entry that lies wholly inside the record, by a table.
     void rows(const List& list, const CountedList& entries, const Layout& layout) {
         beginList(list);
-        for (std::size_t i = 0, count = entries.whole(); i < count; ++i) {
+        for (std::size_t i = 0, count = entries.completeCount(); i < count; ++i) {
             beginRow();
             fields(entries[i], layout);
             endRow();

@@ -58,7 +58,7 @@ void NeighborCellsList::check(const View& view, const Record& record) const {
     logFormat(LogPriority::Warning, "Number of neighboring cells being reported: %d\n",
               static_cast<int>(cells.count()));
     if (isLogged(LogPriority::Warning))
-        for (std::size_t i = 0; i < cells.whole(); ++i)
+        for (std::size_t i = 0; i < cells.completeCount(); ++i)
             traceCell(cells[i]);
     reportMissingEntries(cells, view.code);
 }

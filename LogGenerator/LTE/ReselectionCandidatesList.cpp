@@ -59,9 +59,10 @@ const Layout& detailsOf(const Record& candidate) {
 }
 
 /// How many candidates, from the first on, lie wholly inside the record with what belongs to their type.
-std::size_t wholeCandidates(const ReselectionRecord& reselection, const CountedList& headers) {
+std::size_t completeCandidates(const ReselectionRecord& reselection, const CountedList& headers) {
     std::size_t i = 0;
-    while (i < headers.whole() && i < reselection.candidates(detailsOf(headers[i]).minimumLength).whole())
+    while (i < headers.completeCount() &&
+           i < reselection.candidates(detailsOf(headers[i]).minimumLength).completeCount())
         ++i;
     return i;
 }
@@ -78,14 +79,14 @@ std::span<const View> ReselectionCandidatesList::views() const {
 void ReselectionCandidatesList::check(const View& view, const Record& record) const {
     const ReselectionRecord reselection(record);
     const CountedList headers = reselection.candidates(header.minimumLength);
-    reportMissingEntries(wholeCandidates(reselection, headers), headers.count(), view.code);
+    reportMissingEntries(completeCandidates(reselection, headers), headers.count(), view.code);
 }
 
 void ReselectionCandidatesList::decode(const View&, const Record& record, FieldVisitor& visitor) const {
     const ReselectionRecord reselection(record);
     const CountedList headers = reselection.candidates(header.minimumLength);
     visitor.beginList(rows);
-    for (std::size_t i = 0, count = wholeCandidates(reselection, headers); i < count; ++i) {
+    for (std::size_t i = 0, count = completeCandidates(reselection, headers); i < count; ++i) {
         const Layout& detail = detailsOf(headers[i]);
         visitor.beginRow();
         visitor.fields(headers[i], header);

@@ -55,7 +55,7 @@ void CCTRCHSIRMeasurement::check(const View& view, const Record& record) const {
 void CCTRCHSIRMeasurement::decode(const View&, const Record& record, FieldVisitor& visitor) const {
     const CountedList channels = compositeChannels(record);
     visitor.beginList(rows);
-    for (std::size_t i = 0; i < channels.whole(); ++i) {
+    for (std::size_t i = 0; i < channels.completeCount(); ++i) {
         visitor.beginRow();
         visitor.fields(channels[i], channel);
         visitor.beginList(ratios);

@@ -64,7 +64,7 @@ void UTRANNeighbhorMeasurements::check(const View& view, const Record& record) c
 void UTRANNeighbhorMeasurements::decode(const View&, const Record& record, FieldVisitor& visitor) const {
     const CountedList entries = cells(record);
     visitor.beginList(rows);
-    for (std::size_t i = 0; i < entries.whole(); ++i) {
+    for (std::size_t i = 0; i < entries.completeCount(); ++i) {
         visitor.beginRow();
         visitor.fields(entries[i], cell);
         if (const std::int64_t set = status.place.read(entries[i]); set != noSet)

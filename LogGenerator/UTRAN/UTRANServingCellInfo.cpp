@@ -20,7 +20,7 @@ constexpr Field cellFields[] = {
 };
 constexpr Layout servingCell = layout(26, cellFields); // 0xD0E2
 
-constexpr CellField knownFields[] = {
+constexpr CellField serviceFields[] = {
     {kVoxCellMonitorLAC, CellNumber::Whole, "Local Area Code", integer("%d"),
      "Serving Cell Info: Failed to retrieve LAC\n"},
     {kVoxCellMonitorCellId, CellNumber::Whole, "Cell ID", integer("%d"),
@@ -37,7 +37,7 @@ constexpr CellField knownFields[] = {
 constexpr CellKind cellKinds[] = {
     {kVoxCellMonitorRadioAccessTechnologyUTRAN, kVoxCellMonitorCellTypeServing},
 };
-constexpr CellTable knownCells{cellKinds, CellTable::Shown::Last, knownFields};
+constexpr CellTable serviceCells{cellKinds, CellTable::Shown::Last, serviceFields};
 constexpr View sectionViews[] = {
     {0xD0E2, servingCell},
     cellInformation,
@@ -54,7 +54,7 @@ void UTRANServingCellInfo::trace() const {
 }
 
 const CellTable& UTRANServingCellInfo::cellTable() const {
-    return knownCells;
+    return serviceCells;
 }
 
 void UTRANServingCellInfo::unknownCode(std::uint32_t) const {}

@@ -85,8 +85,8 @@ std::optional<Reading> OneXStatus::accept(const Record& record, Dictionary& stat
     const FoundSubPacket active = subPackets.find(activeSet);
     const FoundSubPacket fingers = subPackets.find(fingerInformation);
     for (const FoundSubPacket& each : {system, radio, active, fingers})
-        if (each.outcome == FoundSubPacket::Outcome::Outside) {
-            static_cast<void>(subPackets.reaches(each, SubPackets::headerLength, logCode()));
+        if (each.outcome == FoundSubPacket::Outcome::PastEnd) {
+            static_cast<void>(subPackets.contains(each, SubPackets::headerLength, logCode()));
             return std::nullopt;
         }
     if (!system.found() || !radio.found() || !active.found() || !fingers.found()) {
@@ -96,14 +96,14 @@ std::optional<Reading> OneXStatus::accept(const Record& record, Dictionary& stat
     }
 
     // All that is needed is looked for first, so that a record is shown whole or not at all.
-    if (!subPackets.reaches(system, endOf(systemStateFields, true), logCode()))
+    if (!subPackets.contains(system, endOf(systemStateFields, true), logCode()))
         return std::nullopt;
     const bool traffic = isTraffic(subPackets.from(system));
-    if (!subPackets.reaches(radio, endOf(radioFields, traffic), logCode()) ||
-        !subPackets.reaches(active, ActiveSetInfo::headerLength, logCode()))
+    if (!subPackets.contains(radio, endOf(radioFields, traffic), logCode()) ||
+        !subPackets.contains(active, ActiveSetInfo::headerLength, logCode()))
         return std::nullopt;
     const ActiveSetInfo activeSetInfo(subPackets.from(active));
-    if (!subPackets.reaches(active, activeSetInfo.neededLength(), logCode()))
+    if (!subPackets.contains(active, activeSetInfo.neededLength(), logCode()))
         return std::nullopt;
 
     Reading reading{record, std::nullopt, status};

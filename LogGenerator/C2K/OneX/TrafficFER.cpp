@@ -30,7 +30,7 @@ std::optional<Reading> TrafficFER::accept(const Record& record, Dictionary& stat
         logLine(LogPriority::Warning, "Log code 0x119d: missing traffic demod subpacket.");
         return std::nullopt;
     }
-    if (!subPackets.reaches(demodulation, erasureAt + 1, logCode()))
+    if (!subPackets.contains(demodulation, erasureAt + 1, logCode()))
         return std::nullopt;
     const bool erased = subPackets.from(demodulation).u8(erasureAt) != 0;
     return Reading{Record(Bytes()), FrameErrorAverage(state).add(erased)};

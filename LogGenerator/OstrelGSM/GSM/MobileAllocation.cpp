@@ -42,7 +42,7 @@ void MobileAllocation::decode(const View&, const Record& record, FieldVisitor& v
     visitor.fields(record, hopping);
     const CountedList entries = arfcns(record);
     visitor.beginList(arfcnList);
-    for (std::size_t i = 0; i < entries.whole(); ++i)
+    for (std::size_t i = 0; i < entries.completeCount(); ++i)
         visitor.number(arfcn, arfcn.place.read(entries[i]));
     visitor.endList();
 }

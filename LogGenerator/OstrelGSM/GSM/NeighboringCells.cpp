@@ -27,17 +27,17 @@ constexpr Field bsic{"BSIC", u8At(2), integer("%d")};
 static_assert(bsicARFCN.end() <= bsicEntryLength && bsic.place.end() <= bsicEntryLength);
 
 // Twice the telephony service's number is the level in dBm.
-constexpr CellField knownFields[] = {
+constexpr CellField serviceFields[] = {
     {kVoxCellMonitorARFCN, CellNumber::Low16, "ARFCN", integer("%d"),
      "NeighboringCells: Failed to retrieve ARFCN\n"},
     {kVoxCellMonitorRSSI, CellNumber::SignedLow16, "RSSI",
      unless(levelNotMeasured, "", integer("%d dBm", 0, 2)), "NeighboringCells: Failed to retrieve RSSI\n"},
 };
 
-constexpr CellKind knownKinds[] = {
+constexpr CellKind serviceKinds[] = {
     {kVoxCellMonitorRadioAccessTechnologyGSM, kVoxCellMonitorCellTypeNeighbor},
 };
-constexpr CellTable known{knownKinds, CellTable::Shown::Rows, knownFields};
+constexpr CellTable serviceCells{serviceKinds, CellTable::Shown::Rows, serviceFields};
 
 constexpr List rows{};
 
@@ -70,7 +70,7 @@ void NeighboringCells::trace() const {
 }
 
 const CellTable& NeighboringCells::cellTable() const {
-    return known;
+    return serviceCells;
 }
 
 void NeighboringCells::check(const View& view, const Record& record) const {
@@ -103,7 +103,7 @@ void NeighboringCells::decode(const View& view, const Record& record, FieldVisit
     const CountedList cells = measuredCells(record);
     const CountedList knownBSICs = bsicEntries(_bsicsOfCells);
     visitor.beginList(rows);
-    for (std::size_t i = 0; i < cells.whole(); ++i) {
+    for (std::size_t i = 0; i < cells.completeCount(); ++i) {
         visitor.beginRow();
         visitor.fields(cells[i], measured);
         // Of an ARFCN that stands there twice, the later one counts.

@@ -47,7 +47,7 @@ void EquivalentPLMNList::decode(const View&, const Record& record, FieldVisitor&
     // The list ends with the last entry that lies wholly inside the record.
     const CountedList entries = networks(record);
     visitor.beginList(rows);
-    for (std::size_t i = 0; i < entries.whole(); ++i) {
+    for (std::size_t i = 0; i < entries.completeCount(); ++i) {
         const Record e = entries[i];
         visitor.beginRow();
         visitor.number(countryCode, threeDigits(e.u8(0), e.u8(2), e.u8(4)));

@@ -28,7 +28,7 @@ void ActiveSet::checkCells(const Record& record) const {
 void ActiveSet::visitCells(const Record& record, FieldVisitor& visitor) const {
     const SearcherRecord searcher(record);
     const int rssi = (searcher.power() + 512) / 10 - 106; // rounded toward zero
-    for (std::size_t i = 0; i < searcher.measurements().whole(); ++i) {
+    for (std::size_t i = 0; i < searcher.measurements().completeCount(); ++i) {
         const Record cell = searcher.cells()[i];
         if (SearcherRecord::setType.read(cell) != activeSet)
             continue;

@@ -66,7 +66,7 @@ double meanPower(const Record& record) {
     const CountedList entries = powerEntries(record);
     int sum = 0;
     int count = 0;
-    for (std::size_t i = 0; i < entries.whole(); ++i) {
+    for (std::size_t i = 0; i < entries.completeCount(); ++i) {
         const int term = static_cast<int>(powerTerm.read(entries[i]));
         if (term == 0)
             continue; // neither summed nor counted

@@ -31,7 +31,7 @@ CountedList rankedCells(const Record& record) {
                        static_cast<std::size_t>(rankedCount.read(record)));
 }
 
-constexpr CellField knownFields[] = {
+constexpr CellField serviceFields[] = {
     {kVoxCellMonitorUARFCN, CellNumber::Low16, "UARFCN", integer("%d"),
      "UMTSSet: Failed to retrieve UARFCN\n"},
     {kVoxCellMonitorSCN, CellNumber::Low16, "Scrambling Code", integer("%d"),
@@ -41,10 +41,10 @@ constexpr CellField knownFields[] = {
     {kVoxCellMonitorECN0, CellNumber::SignedLow16, "Energy Per Chip",
      unless(levelNotMeasured, "", integer("%d dB")), "UMTSSet: Failed to retrieve Energy Per Chip\n"},
 };
-constexpr CellKind knownKinds[] = {
+constexpr CellKind serviceKinds[] = {
     {kVoxCellMonitorRadioAccessTechnologyUMTS, kVoxCellMonitorCellTypeNeighbor},
 };
-constexpr CellTable known{knownKinds, CellTable::Shown::Rows, knownFields};
+constexpr CellTable serviceCells{serviceKinds, CellTable::Shown::Rows, serviceFields};
 constexpr View sectionViews[] = {
     {0x4005, rankedMinimumLength},
     cellInformation,
@@ -61,7 +61,7 @@ void UMTSSet::trace() const {
 }
 
 const CellTable& UMTSSet::cellTable() const {
-    return known;
+    return serviceCells;
 }
 
 void UMTSSet::check(const View& view, const Record& record) const {
