@@ -14,8 +14,9 @@ namespace {
 
 constexpr Place physicalCellID = bitsAt(0, 0, 9);
 
-// Meant as they stand: both antennas are read from the same bits, and an RSRP step is half a decibel, twice
-// the serving cell's.
+// Physical cell identity (3GPP TS 36.211 6.11), RSRP, RSRQ and RSSI (quantities of TS 36.214), Srxlev (TS
+// 36.304 5.2.3.2), all on the modem's own scales. On purpose, both antennas are read from the same bits, and
+// an RSRP step is half a decibel, twice the serving cell's.
 constexpr Field cellFields[] = {
     {"Physical Cell ID", physicalCellID, integer("%d")},
     {"Measured RSSI", bitsAt(1, 1, 8), real("%4.2f dBm", 0.5, -140)},

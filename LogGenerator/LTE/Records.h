@@ -39,8 +39,9 @@ private:
     CountedList _detected;
 };
 
-/// How 0xB179 shows a filtered level and quality, of the serving cell and of the neighbours alike. The
-/// quality's offset differs from that of the idle-mode records (-30), as intended.
+/// How 0xB179 shows a filtered level and quality, of the serving cell and of the neighbours alike. RSRP and
+/// RSRQ are quantities of 3GPP TS 36.214 (5.1.1, 5.1.3); the scales are the modem's, not the steps of TS
+/// 36.133 9.1.4 and 9.1.7. The quality's offset differs from that of the idle-mode records (-30), on purpose.
 inline constexpr TextFormat filteredRSRP = real("%4.2f dBm", 0.25, -140);
 inline constexpr TextFormat filteredRSRQ = real("%4.2f dB", 0.125, -20);
 

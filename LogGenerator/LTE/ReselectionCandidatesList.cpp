@@ -14,12 +14,14 @@ using LTE::ReselectionRecord;
 
 namespace {
 
+// As the modem reports them.
 constexpr EnumText ratTypeRows[] = {
     {0, "LTE"}, {1, "UTRAN"}, {2, "GERAN"}, {3, "CDMA1XRTT"}, {4, "CDMAHRPD"},
 };
 constexpr EnumTexts ratTypes(ratTypeRows, "??");
 constexpr Place ratType = u16At(2);
 
+// Reselection priority (3GPP TS 36.304 5.2.4.1).
 constexpr Field headerFields[] = {
     {"Candidate Priority", u16At(0), integer("%d")},
     {"Candidate RAT Type", ratType, text(ratTypes)},
@@ -27,6 +29,9 @@ constexpr Field headerFields[] = {
 constexpr Layout header = layout(ReselectionRecord::stride, headerFields);
 
 // What belongs to the radio technology; offsets count from the candidate's header, like the header's own.
+// Channels and cells: EARFCN (3GPP TS 36.101 5.7.3), physical cell identity (TS 36.211 6.11); UARFCN (TS
+// 25.101 5.4.3), primary scrambling code (TS 25.213 5.2.2); ARFCN (TS 45.005 2), BSIC (TS 23.003 4.3.2); band
+// class (3GPP2 C.S0057), pilot PN offset (3GPP2 C.S0005). The GERAN band is the modem's number.
 constexpr Field lteFields[] = {
     {"E ARFCN", u16At(4), integer("%d")}, // with a blank, unlike the other sections' "E-ARFCN"
     {"Cell ID", bitsAt(6, 7, 9), integer("%d")},

@@ -17,7 +17,8 @@ static_assert(count.end() <= minimumLength);
 constexpr std::size_t firstEntry = 168;
 constexpr std::size_t entryLength = 16;
 
-// The fields stand bit by bit one after the other in the entry's first four bytes.
+// UARFCN (3GPP TS 25.102 5.4.3), cell parameter ID (TS 25.223), P-CCPCH RSCP (a quantity of TS 25.225) in the
+// modem's own steps of 1/256. The fields are packed into the entry's first four bytes.
 constexpr Field cellFields[] = {
     {"UARFCN", bitsAt(0, 0, 14), integer("%d")},
     {"Cell ID", bitsAt(1, 6, 7), integer("%d")},

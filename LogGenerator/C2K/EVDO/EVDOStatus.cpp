@@ -11,6 +11,8 @@ namespace velmora::C2K {
 
 namespace {
 
+// 0x1183: band class and channel (3GPP2 C.S0057), PN offset in units of 64 chips, UATI and color code
+// (C.S0024); session and device states are by the modem's numbers, levels as the modem reports them.
 constexpr std::size_t exactLength = 50;
 
 constexpr EnumText deviceStateRows[] = {

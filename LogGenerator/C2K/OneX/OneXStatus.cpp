@@ -20,6 +20,7 @@ constexpr std::uint8_t radioFrequency = 2;
 constexpr std::uint8_t activeSet = 3;
 constexpr std::uint8_t fingerInformation = 4; // must be there, and is not read
 
+// 0x119C, sub-packet 1: as the modem reports it.
 constexpr EnumText deviceStateRows[] = {
     {0, "Inactive [0]"},
     {1, "Deep sleep in start state [1]"},
@@ -41,6 +42,8 @@ constexpr ValueField systemStateFields[] = {
     {"k1xDeviceState", u8At(4), text(deviceStates)},
 };
 
+// 0x119C, sub-packet 2: band class (3GPP2 C.S0057), CDMA channel number (C.S0057); levels on the modem's own
+// scales, 0.334 dB from -63.248 dBm and 0.1 dBm.
 constexpr TextFormat receiveLevel = real("%+.2f dBm", 0.334, -63.248);
 
 constexpr ValueField radioFields[] = {

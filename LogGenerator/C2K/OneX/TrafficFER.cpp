@@ -11,6 +11,7 @@ namespace velmora::C2K {
 
 namespace {
 
+// 0x119D: whether the frame was erased, as the modem reports it.
 constexpr std::uint8_t trafficDemodulation = 11;
 constexpr std::size_t erasureAt = 24; // in the sub-packet
 

@@ -9,10 +9,11 @@ namespace velmora {
 
 namespace {
 
+// 0x51F8: the hopping sequence number (3GPP TS 45.002 6.2.3), then ARFCNs (TS 45.005 2).
 constexpr Field hoppingFields[] = {
     {"HSN", u8At(13), integer("%d")},
 };
-constexpr Layout hopping = layout(15, hoppingFields); // 0x51F8; the count at 14 and the ARFCNs follow
+constexpr Layout hopping = layout(15, hoppingFields); // the count at 14 and the ARFCNs follow
 constexpr std::size_t arfcnLength = 2;
 constexpr Field arfcn{"", u16At(0), integer("%d")};
 static_assert(arfcn.place.end() <= arfcnLength);

@@ -12,6 +12,7 @@ namespace {
 
 constexpr std::uint32_t measuredCode = 0x5137;
 constexpr std::size_t measuredMinimumLength = 29;
+// ARFCN (3GPP TS 45.005 2), C1 (TS 45.008 6.4); the level is the modem's number, not RXLEV.
 constexpr Field measuredFields[] = {
     {"ARFCN", u16At(0), integer("%d")},
     {"RSSI", u8At(2), integer("%d")}, // without a unit
@@ -20,13 +21,14 @@ constexpr Field measuredFields[] = {
 constexpr Layout measured = layout(14, measuredFields);
 constexpr Place measuredARFCN = measuredFields[0].place;
 
-constexpr std::size_t bsicMinimumLength = 15; // 0x51FF
+// 0x51FF: the BSIC (3GPP TS 23.003 4.3.2) of an ARFCN.
+constexpr std::size_t bsicMinimumLength = 15;
 constexpr std::size_t bsicEntryLength = 4;
 constexpr Place bsicARFCN = u16At(0);
 constexpr Field bsic{"BSIC", u8At(2), integer("%d")};
 static_assert(bsicARFCN.end() <= bsicEntryLength && bsic.place.end() <= bsicEntryLength);
 
-// Twice the telephony service's number is the level in dBm.
+// As the telephony service reports it: twice its number is the level in dBm.
 constexpr CellField serviceFields[] = {
     {kVoxCellMonitorARFCN, CellNumber::Low16, "ARFCN", integer("%d"),
      "NeighboringCells: Failed to retrieve ARFCN\n"},

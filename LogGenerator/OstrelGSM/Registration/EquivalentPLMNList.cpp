@@ -9,6 +9,7 @@ namespace velmora {
 
 namespace {
 
+// 0x7150: MCC and MNC (3GPP TS 23.003 2.2), one digit a byte and alternating, as the modem reports them.
 constexpr std::size_t minimumLength = 17;
 // Entries lie three bytes apart although six are read from each, so that they overlap. That is how the record
 // is read, and it is kept.

@@ -13,6 +13,8 @@ namespace {
 
 constexpr std::int64_t activeSet = 0;
 
+// Primary scrambling code (3GPP TS 25.213 5.2.2), CPICH RSCP and Ec/No (quantities of TS 25.215), both
+// computed from the modem's own scales.
 constexpr Field scramblingCode{"Scrambling Code", SearcherRecord::scramblingCode, integer("%d")};
 // A level, whose unit is shown so all the same.
 constexpr Field codePower{"RSCP", computed, integer("%d dB")};
