@@ -93,7 +93,7 @@ const View* Base::viewOf(std::uint32_t logCode) const {
 
 bool Base::prepareFor(const View& view, KeptRecords::Parts parts) {
     if (_arrayRef.get())
-        _records.dropAllBut(indexOf(view)); // a list is replaced as a whole
+        _records.dropAllBut(indexOf(view)); // a list is replaced completely
     else if (!_dictionaryRef.get())
         return false;
     if (_records.wouldLose(indexOf(view), parts))
@@ -143,7 +143,7 @@ void Base::replaceArray(Array& array, const Array& newElements) {
 std::int16_t Base::lookUpECNO(std::uint32_t value) {
     if (value >= 524288)
         return 0;
-    // Entry i is the threshold above which the value is -(i + 1) dB. The last threshold gives -31 like the
+    // Entry i is the threshold above which the value is -(i + 1) dB. The last threshold means -31 like the
     // one before it: there is no -32.
     static constexpr std::uint32_t thresholds[] = {
         417647, 331808, 263624, 209463, 166441, 132268, 105123, 83562, 66435, 52830, 42023,

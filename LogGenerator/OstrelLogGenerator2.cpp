@@ -57,7 +57,7 @@ OstrelLogGenerator2::~OstrelLogGenerator2() {
     } catch (const std::exception& failure) {
         logFormat(LogPriority::Error, "the display lacks its last records: %s", failure.what());
     }
-    // The same words for every technology.
+    // The same text for every technology.
     logFormat(LogPriority::Warning, "Ostrel_GSMLogGenerator is destructed %p", static_cast<void*>(this));
 }
 
@@ -139,7 +139,7 @@ Value OstrelLogGenerator2::getDisplayFromState(Dictionary& state) {
 
 void OstrelLogGenerator2::attachSections(const Value& object) {
     // The state outlives decoders. After a reconnection this decoder's sections have no nodes yet while the
-    // display of the earlier one is still shown: they go on in it, and nothing that it shows is lost.
+    // display of the earlier one is still shown: they continue in it, and nothing that it shows is lost.
     if (const Dictionary* dictionary = object.asDictionary()) {
         for (const auto& [key, value] : *dictionary) {
             if (Base* section = cIndex->getClass(key))
@@ -168,7 +168,7 @@ Value OstrelLogGenerator2::processTemplate(const Value& object) {
         for (const auto& [key, value] : *object.asDictionary()) {
             Value processed = processTemplate(value);
             if (processed.isNone())
-                continue; // a foreign kind has been reported; its key is left out
+                continue; // a foreign kind has been reported; its key is skipped
             if (Base* section = cIndex->getClass(key))
                 section->updateSectionRef(processed);
             result->set(key, std::move(processed));

@@ -12,7 +12,7 @@
 
 namespace velmora {
 
-/// Raised by the view of a counted list when an entry at or beyond its count is asked for.
+/// Raised by the view of a counted list for an entry at or beyond its count.
 class ArrayOutOfBoundsException : public std::exception {
 public:
     [[nodiscard]] const char* what() const noexcept override { return "array index out of bounds"; }

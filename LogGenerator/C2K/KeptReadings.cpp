@@ -13,7 +13,8 @@ KeptReadings::KeptReadings()
       _numbers(logCodeParsers().size() * Reading::mostParts) {}
 
 void KeptReadings::use(const DictionaryRef& lookup) {
-    // A later lookup may lie where one lay that is gone: that it is the same one takes both.
+    // A new lookup may have the address of one that was destroyed, so that the address alone does not
+    // identify it.
     if (lookup.get() == _used && !_lookup.owner_before(lookup) && !lookup.owner_before(_lookup))
         return;
     write();

@@ -121,13 +121,13 @@ private:
         return true;
     }
 
-    /// What a key means: the place of a number, or one of these.
+    /// What a key means: the index of a number, or one of these.
     static constexpr std::uint8_t technologyKey = cellNumberCount;
     static constexpr std::uint8_t typeKey = cellNumberCount + 1;
     static constexpr std::uint8_t otherKey = cellNumberCount + 2;
     static constexpr std::uint8_t unreadKey = 0xFF;
 
-    /// Each key is looked at once; the cells share them.
+    /// Each key is read once; the cells share them.
     bool readKey(std::size_t index, std::uint8_t& meaning) {
         const bool remembered = index < _keys.size();
         if (remembered && _keys[index] != unreadKey) {
@@ -186,7 +186,7 @@ private:
         return true;
     }
 
-    /// A text that says of which kind a cell is.
+    /// A text that names a technology or a type.
     struct Kind {
         std::size_t object = ~std::size_t{0};
         std::uint8_t technology = 0;

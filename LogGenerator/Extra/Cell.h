@@ -24,7 +24,7 @@ constexpr std::uint8_t indexOf(std::string_view text, const std::string_view (&t
     return index;
 }
 
-/// The telephony service's keys for the numbers of a cell, of which a section may ask.
+/// The telephony service's keys for the numbers of a cell that a section may show.
 inline constexpr std::string_view cellNumberKeys[] = {
     kVoxCellMonitorMCC,      kVoxCellMonitorMNC,   kVoxCellMonitorLAC,    kVoxCellMonitorTAC,
     kVoxCellMonitorCellId,   kVoxCellMonitorARFCN, kVoxCellMonitorUARFCN, kVoxCellMonitorPID,
@@ -75,14 +75,14 @@ struct Cell {
     [[nodiscard]] std::optional<std::int32_t> number(CellKey key) const {
         return has(key) ? std::optional(numbers[key.index]) : std::nullopt;
     }
-    /// Takes a number in; one that 32 bits do not hold is none.
+    /// Sets a number; one that does not fit 32 bits is absent.
     void setNumber(std::size_t index, std::int64_t number) {
         const bool fits = number >= std::numeric_limits<std::int32_t>::min() &&
                           number <= std::numeric_limits<std::int32_t>::max();
         numbers[index] = static_cast<std::int32_t>(number);
         present = (present & ~(1u << index)) | std::uint32_t{fits} << index;
     }
-    /// What stands there is no number.
+    /// The value under that key is no number.
     void clearNumber(std::size_t index) { present &= ~(1u << index); }
 };
 

@@ -16,7 +16,7 @@ namespace {
 /// A longer payload is read again by every section, and so not cached.
 constexpr std::size_t longestKept = std::size_t{1} << 16;
 
-/// A cell of the array as the property-list reader gave it.
+/// A cell of the array as the property-list reader returned it.
 Cell cellOf(const Dictionary& fields) {
     Cell cell;
     if (const std::string* text = fields[kVoxCellMonitorCellRadioAccessTechnology].asString())

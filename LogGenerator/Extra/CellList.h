@@ -16,12 +16,12 @@ namespace velmora {
 /// sections of a class index.
 class CellList {
 public:
-    /// The cells of the record, in the list's order, but what is no cell; null where the payload holds no
+    /// The cells of the record, in the list's order, without what is no cell; null where the payload holds no
     /// array or cannot be read, which then is logged as CellInfoArrayReader does. Valid until the next call.
     [[nodiscard]] const std::vector<Cell>* read(const Data& record);
 
-    /// As long as it lives, every call of `read` is for one and the same record, so that it need not be
-    /// compared with the last.
+    /// During its lifetime every call of `read` is for the same record, which need not be compared with the
+    /// last one then.
     class SameRecordScope {
     public:
         explicit SameRecordScope(CellList& cells) : _cells(cells) { _cells._isSameRecord = true; }
@@ -41,7 +41,7 @@ private:
     std::vector<Cell> _cells;
     XMLCellReader _xmlReader;
     bool _isSameRecord = false;
-    bool _isRead = false; ///< the one record has been
+    bool _isRead = false; ///< the same record has been
 };
 
 /// The first cell of that kind, or null.

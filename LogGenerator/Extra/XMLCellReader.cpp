@@ -36,7 +36,7 @@ public:
         passSpace();
         return take(token);
     }
-    /// Plain text up to the closing tag, which goes too.
+    /// Plain text up to the closing tag, which is removed too.
     [[nodiscard]] bool text(std::string_view closing, std::string_view& text) {
         std::size_t end = 0;
         while (end < _rest.size() && _rest[end] >= ' ' && _rest[end] <= '~' && _rest[end] != '<' &&
@@ -106,7 +106,7 @@ const XMLCellReader::Segment* XMLCellReader::segmentAt(std::string_view rest, bo
             ++found;
         if (found == _segments.size()) {
             if (_segments.size() == maximumSegments)
-                _segments.clear(); // what still comes is learnt again
+                _segments.clear(); // what follows is cached again
             if (!addSegment(rest, begins))
                 return nullptr;
             found = _segments.size() - 1;

@@ -40,7 +40,7 @@ private:
         std::string text;
         bool begins = false; ///< it is at the list's start, not after a number
         std::vector<Step> steps;
-        std::uint8_t number = noNumber; ///< the place of the number that follows
+        std::uint8_t number = noNumber; ///< the index of the number that follows
         std::size_t next = 0;           ///< which segment followed last time
     };
 

@@ -78,7 +78,7 @@ const CellTable& LTEServingCellInfo::cellTable() const {
 }
 
 void LTEServingCellInfo::check(const View& view, const Record&) const {
-    // Shown, and reported as if it were unknown: both are meant.
+    // On purpose, it is shown and reported as unknown as well.
     if (view.code == antennaCode)
         unknownLogMessage(view.code);
 }
@@ -89,7 +89,7 @@ void LTEServingCellInfo::decode(const View& view, const Record& record, FieldVis
         return;
     }
     visitor.fields(record, carrier);
-    // The telephony service's name for the downlink frequency goes when the baseband's arrives.
+    // The baseband's downlink frequency replaces the telephony service's, which has another label.
     visitor.removed("UARFCN");
     visitor.fields(record, identity);
 }

@@ -63,7 +63,7 @@ const Layout& detailsOf(const Record& candidate) {
     return type < std::size(details) ? details[type] : noDetails;
 }
 
-/// How many candidates, from the first on, lie wholly inside the record with what belongs to their type.
+/// How many candidates, from the first on, lie completely inside the record with what belongs to their type.
 std::size_t completeCandidates(const ReselectionRecord& reselection, const CountedList& headers) {
     std::size_t i = 0;
     while (i < headers.completeCount() &&

@@ -16,7 +16,7 @@ constexpr std::int64_t knownVersion = 1;
 /// What the mode reads as in a record of another version.
 constexpr std::int64_t noMode = 255;
 
-/// RRC states (3GPP TS 25.331 7.1), by the modem's numbers.
+/// RRC states (3GPP TS 25.331 7.1), with the modem's own numbers.
 constexpr EnumText stateRows[] = {
     {0, "Disconnected"}, {1, "Connecting"}, {2, "Cell Fach"},
     {3, "Cell DCH"},     {4, "Cell PCH"},   {5, "Cell URA PCH"},

@@ -30,7 +30,7 @@ constexpr EnumText statusRows[] = {{0, "ASET"}, {1, "MSET"}, {2, "DSET"}};
 constexpr EnumTexts statuses(statusRows, "");
 constexpr Field status{"Status", bitsAt(3, 5, 2), text(statuses)};
 static_assert(status.place.end() <= entryLength);
-/// The last of the four has no text: the label is left out of its row.
+/// The last of the four has no text: its row lacks the label.
 constexpr std::int64_t noSet = 3;
 
 constexpr Field detectionFields[] = {

@@ -98,7 +98,7 @@ std::optional<Reading> OneXStatus::accept(const Record& record, Dictionary& stat
         return std::nullopt;
     }
 
-    // All that is needed is looked for first, so that a record is shown whole or not at all.
+    // All that is needed is checked first, so that a record is shown completely or not at all.
     if (!subPackets.contains(system, endOf(systemStateFields, true), logCode()))
         return std::nullopt;
     const bool traffic = isTraffic(subPackets.from(system));

@@ -14,8 +14,8 @@ namespace velmora::C2K {
 struct FoundSubPacket {
     enum class Outcome : std::uint8_t {
         Found,
-        Missing, ///< there is none, or an error in size came first (which has been reported)
-        PastEnd, ///< the search came to a header that the record does not hold
+        Missing, ///< there is none, or there was an error in size before it (which has been reported)
+        PastEnd, ///< the search reached a header that is not inside the record
     };
 
     Outcome outcome = Outcome::Missing;
@@ -40,7 +40,7 @@ public:
     [[nodiscard]] FoundSubPacket find(std::uint8_t id) const;
 
     /// Whether the record holds the first `length` bytes from the sub-packet's start on; an error line where
-    /// it does not. Every search that ended outside the record fails here.
+    /// it does not. False for every search that ended past the end of the record.
     [[nodiscard]] bool contains(const FoundSubPacket& subPacket, std::size_t length,
                                 std::uint16_t logCode) const;
 

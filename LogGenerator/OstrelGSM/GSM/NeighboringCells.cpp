@@ -51,7 +51,7 @@ CountedList bsics(const Record& record) {
     return CountedList(record, bsicMinimumLength, bsicEntryLength, record.u8(14));
 }
 
-/// What `bsics` gave of an earlier record.
+/// What `bsics` returned for an earlier record.
 CountedList bsicEntries(Bytes entries) {
     return CountedList(Record(entries), 0, bsicEntryLength, entries.size() / bsicEntryLength);
 }
@@ -89,7 +89,7 @@ void NeighboringCells::updateWithData(const Data& data, std::uint32_t logCode) {
     trace();
     check(*view, record);
     if (view->code == measuredCode) {
-        // The BSICs as they are known now go with the cells.
+        // The current BSICs are kept with the cells.
         keep(*view, record, 1, [this] { _bsicsOfCells = arfcnToBsic; });
     } else {
         const Bytes kept = bsics(record).entries().bytes();
@@ -108,7 +108,7 @@ void NeighboringCells::decode(const View& view, const Record& record, FieldVisit
     for (std::size_t i = 0; i < cells.completeCount(); ++i) {
         visitor.beginRow();
         visitor.fields(cells[i], measured);
-        // Of an ARFCN that stands there twice, the later one counts.
+        // Of an ARFCN that is listed twice, the later entry counts.
         for (std::size_t j = knownBSICs.count(); j-- > 0;)
             if (bsicARFCN.read(knownBSICs[j]) == measuredARFCN.read(cells[i])) {
                 visitor.number(bsic, bsic.place.read(knownBSICs[j]));

@@ -28,7 +28,7 @@ std::span<const View> ProcessCO::views() const {
 }
 
 void ProcessCO::trace() const {
-    logLine(LogPriority::Warning, "ProcessCS"); // the circuit-switched section's word, shared on purpose
+    logLine(LogPriority::Warning, "ProcessCS"); // the circuit-switched section's text, on purpose
 }
 
 } // namespace velmora

@@ -10,8 +10,8 @@ namespace velmora {
 
 namespace {
 
-// 0x7130: GMM states and sub-states (3GPP TS 24.008 4.1.3.1) and GPRS update status (4.1.3.2), by the modem's
-// numbers.
+// 0x7130: GMM states and sub-states (3GPP TS 24.008 4.1.3.1) and GPRS update status (4.1.3.2), with the
+// modem's own numbers.
 constexpr EnumText stateRows[] = {
     {0, "GMM_NULL"},
     {1, "GMM_DEREGISTERED"},

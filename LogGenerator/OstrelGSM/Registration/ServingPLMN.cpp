@@ -16,8 +16,8 @@ constexpr EnumText selectionModeRows[] = {
 };
 constexpr EnumTexts selectionModes(selectionModeRows, "Unknown");
 
+// As the modem reports them.
 constexpr EnumText serviceTypeRows[] = {
-    // as the modem reports them
     {0, "NO_SERVICE"}, {1, "CS_ONLY"}, {2, "PS_ONLY"}, {3, "CS_PS_SERVICE"}, {4, "LIMITED_SERVICE"},
 };
 constexpr EnumTexts serviceTypes(serviceTypeRows, "Unknown");
@@ -57,7 +57,7 @@ void visitIdentity(const Record& record, FieldVisitor& visitor) {
 }
 
 // As the telephony service reports it: plain decimal numbers, so that a leading zero of the MNC is lost,
-// under the labels that 0x7135 writes as three characters: whichever came last is shown.
+// under the labels that 0x7135 writes as three characters: whichever arrived last is shown.
 constexpr CellField cellFields[] = {
     {kVoxCellMonitorMCC, CellNumber::Whole, "Mobile Country Code", integer("%d"),
      "ServingPLMN: Failed to retrieve MCC\n"},

@@ -36,8 +36,7 @@ constexpr Field processFields[] = {
 constexpr Layout process = layout(9, processFields);
 constexpr List primaryList{"Primary HARQ Process"};
 constexpr List secondaryList{"Secondary HARQ Process"};
-// How far every primary process moves the secondary ones: not the nine bytes of its entry. That is how the
-// record is read, and it is kept.
+// How far every primary process moves the secondary ones: not the nine bytes of its entry, on purpose.
 constexpr std::size_t primarySpan = 162;
 
 CountedList primaryProcesses(const Record& record) {

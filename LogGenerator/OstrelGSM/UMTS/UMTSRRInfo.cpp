@@ -12,7 +12,7 @@ namespace velmora {
 
 namespace {
 
-// 0x4125: RRC states (3GPP TS 25.331 7.1), by the modem's numbers.
+// 0x4125: RRC states (3GPP TS 25.331 7.1), with the modem's own numbers.
 constexpr EnumText rrcStateRows[] = {
     {0, "Disconnected"}, {1, "Connecting"}, {2, "CELL_FACH"},
     {3, "CELL_DCH"},     {4, "CELL_PCH"},   {5, "URA_PCH"},
@@ -112,7 +112,7 @@ void UMTSRRInfo::decode(const View& view, const Record& record, FieldVisitor& vi
         return;
     }
     CellSection::decode(view, record, visitor);
-    // The telephony service's name for the downlink frequency goes when the baseband's arrives.
+    // The baseband's downlink frequency replaces the telephony service's, which has another label.
     if (view.code == cellCode)
         visitor.removed("UARFCN");
 }
