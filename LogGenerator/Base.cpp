@@ -26,8 +26,8 @@ std::vector<std::uint32_t> Base::getLogCodeArray() const {
 
 void Base::updateSectionRef(const Value& node) {
     writeNode();
-    _dictionaryRef.refer(node.dictionaryRef());
-    _arrayRef.refer(node.arrayRef());
+    _dictionaryRef.assign(node.dictionaryRef());
+    _arrayRef.assign(node.arrayRef());
     _views = views();
     _records.clear();
     _records.resize(_views.size());
@@ -36,9 +36,9 @@ void Base::updateSectionRef(const Value& node) {
 
 Value Base::node() {
     writeNode();
-    if (DictionaryRef dictionary = _dictionaryRef.share())
+    if (DictionaryRef dictionary = _dictionaryRef.lock())
         return dictionary;
-    return _arrayRef.share();
+    return _arrayRef.lock();
 }
 
 void Base::updateLogCodeDict(CodeDictionary& codeDict) {
@@ -93,7 +93,7 @@ const View* Base::viewOf(std::uint32_t logCode) const {
 
 bool Base::prepareFor(const View& view, KeptRecords::Parts parts) {
     if (_arrayRef.get())
-        _records.dropAllBut(indexOf(view)); // a list is replaced as a whole
+        _records.dropAllBut(indexOf(view)); // a list is replaced completely
     else if (!_dictionaryRef.get())
         return false;
     if (_records.wouldLose(indexOf(view), parts))
@@ -143,7 +143,7 @@ void Base::replaceArray(Array& array, const Array& newElements) {
 std::int16_t Base::lookUpECNO(std::uint32_t value) {
     if (value >= 524288)
         return 0;
-    // Entry i is the threshold above which the value is -(i + 1) dB. The last threshold gives -31 like the
+    // Entry i is the threshold above which the value is -(i + 1) dB. The last threshold means -31 like the
     // one before it: there is no -32.
     static constexpr std::uint32_t thresholds[] = {
         417647, 331808, 263624, 209463, 166441, 132268, 105123, 83562, 66435, 52830, 42023,
@@ -158,13 +158,13 @@ std::int16_t Base::lookUpECNO(std::uint32_t value) {
 }
 
 void Base::reportMissingEntries(const CountedList& list, std::uint32_t logCode) {
-    if (!list.isWhole())
-        reportMissingEntries(list.whole(), list.count(), logCode);
+    if (!list.isComplete())
+        reportMissingEntries(list.completeCount(), list.count(), logCode);
 }
 
-void Base::reportMissingEntries(std::size_t whole, std::size_t count, std::uint32_t logCode) {
-    if (whole < count)
-        logFormat(LogPriority::Error, "Record 0x%04X: %d of %d entries", logCode, static_cast<int>(whole),
+void Base::reportMissingEntries(std::size_t complete, std::size_t count, std::uint32_t logCode) {
+    if (complete < count)
+        logFormat(LogPriority::Error, "Record 0x%04X: %d of %d entries", logCode, static_cast<int>(complete),
                   static_cast<int>(count));
 }
 

@@ -28,12 +28,13 @@ using ClassDictionary = std::map<std::string, Base*, std::less<>>;
 /// registration.
 using CodeDictionary = std::map<std::string, std::vector<Base*>, std::less<>>;
 
-/// A section: one block of the measurement screen. It names itself, says by its views which log codes it
-/// wants, and what it shows of a record is one function, `decode`, which names the fields to a visitor. Its
-/// node of the display dictionary is owned by the display; the section only refers to it. Main thread only.
+/// A section: one block of the measurement screen. Its views are the log codes that it subscribes to with
+/// what it reads there, and what it shows of a record is one function, `decode`, which names the fields to a
+/// visitor. Its node of the display dictionary is owned by the display; the section only refers to it. Main
+/// thread only.
 ///
 /// On arrival a record is checked, and what is wrong with it is logged. Its fields are written when the
-/// generator hands the display out (`writeNode`) or when the node is asked for; see KeptRecords.
+/// generator hands the display out (`writeNode`) or when the node is requested; see KeptRecords.
 class Base {
 public:
     virtual ~Base() = default;
@@ -55,7 +56,8 @@ public:
     virtual void updateWithData(const Data& data, std::uint32_t logCode);
 
     /// Names the fields of a record of the view to the visitor, in the order in which they are shown.
-    /// Precondition: the record was accepted by `updateWithData`. Not overriding it names the view's table.
+    /// Precondition: the record was accepted by `updateWithData`. The default names the fields of the view's
+    /// table.
     virtual void decode(const View& view, const Record& record, FieldVisitor& visitor) const;
 
     /// Sets the section's node, a dictionary or an array.
@@ -80,17 +82,17 @@ public:
 protected:
     Base() = default;
 
-    /// The line that each record gives, whatever becomes of it: the section's name at warning priority.
+    /// The log line of each record, decoded or not: the section's name at warning priority.
     virtual void trace() const;
     /// A record under a code that no view has: an error line.
     virtual void unknownCode(std::uint32_t logCode) const;
-    /// Logs what an accepted record lacks, once, on arrival. Not overriding it logs nothing.
+    /// Logs what an accepted record lacks, once, on arrival. The default logs nothing.
     virtual void check(const View& view, const Record& record) const;
-    /// How much of an accepted record `decode` reads; the rest is not kept. Not overriding it says what the
+    /// How much of an accepted record `decode` reads; the rest is not kept. The default is what the
     /// view's table reads, or all of it.
     [[nodiscard]] virtual std::size_t neededLength(const View& view, const Record& record) const;
     /// The parts that `decode` names of this record, where records of the view differ in their labels (see
-    /// KeptRecords). Not overriding it says that they do not.
+    /// KeptRecords). The default is that they do not.
     [[nodiscard]] virtual KeptRecords::Parts partsOf(const View& view, const Record& record) const;
 
     /// Keeps what `decode` needs of a record, to be written into the node. Without a node it is dropped.
@@ -112,8 +114,8 @@ protected:
 
     /// "Record 0x5137: 2 of 3 entries", where the record holds fewer than its count announces.
     static void reportMissingEntries(const CountedList& list, std::uint32_t logCode);
-    /// The same for a list whose entries' lengths differ: `whole` of `count` lie inside the record.
-    static void reportMissingEntries(std::size_t whole, std::size_t count, std::uint32_t logCode);
+    /// The same for a list whose entries' lengths differ: `complete` of `count` lie inside the record.
+    static void reportMissingEntries(std::size_t complete, std::size_t count, std::uint32_t logCode);
     /// The error line for a code that the section does not handle.
     static void unknownLogMessage(std::uint32_t logCode);
 
@@ -127,17 +129,17 @@ private:
     void keepPrepared(const View& view, const Record& record, KeptRecords::Parts parts);
     void writeInto(Array& node);
 
-    /// A node that the display owns. On the one thread there is, nothing takes it away while a record is
-    /// decoded, so that it is used without a share in it, which would cost more than to write there.
+    /// A node that the display owns. On the one thread there is, it cannot be destroyed while a record is
+    /// decoded, so that it is used without shared ownership, which would cost more than to write there.
     template <class Node>
     class WatchedNode {
     public:
-        void refer(const std::shared_ptr<Node>& node) {
+        void assign(const std::shared_ptr<Node>& node) {
             _watch = node;
             _node = node.get();
         }
         [[nodiscard]] Node* get() const { return _watch.expired() ? nullptr : _node; }
-        [[nodiscard]] std::shared_ptr<Node> share() const { return _watch.lock(); }
+        [[nodiscard]] std::shared_ptr<Node> lock() const { return _watch.lock(); }
 
     private:
         std::weak_ptr<Node> _watch;
@@ -147,7 +149,7 @@ private:
     /// `sectionRef`: the one of the two that fits the node's kind.
     WatchedNode<Dictionary> _dictionaryRef;
     WatchedNode<Array> _arrayRef;
-    std::span<const View> _views; ///< as `views` gives them, since there has been a node
+    std::span<const View> _views; ///< as `views` returns them, since there has been a node
     KeptRecords _records;
     DisplayWriter::SpareRows _spareRows;
 };

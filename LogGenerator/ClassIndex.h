@@ -20,7 +20,7 @@ namespace velmora {
 /// are called in the order of the fields.
 class ClassIndex {
 public:
-    /// A section of the index, which makes it. The field is all that a technology says of it:
+    /// A section of the index, which creates it. A technology needs no more than this field for it:
     ///     Held<GSMServingCell> objGSMServingCell{*this};
     template <class Section>
     class Held {
@@ -76,7 +76,7 @@ private:
         return made;
     }
 
-    /// A code of `codeDictionary` and where its sections stand there; null in a place that is free.
+    /// A code of `codeDictionary` and its sections there; null in a free slot.
     struct Route {
         std::uint32_t code = 0;
         const std::vector<Base*>* subscribers = nullptr;
@@ -85,8 +85,8 @@ private:
 
     std::vector<std::unique_ptr<Base>> _sections; ///< in the order of their creation
     std::shared_ptr<CellList> _cellList = std::make_shared<CellList>();
-    /// `codeDictionary` as it is looked at for every message: by the code itself, at its remainder or in the
-    /// next place that is free. Made when it is asked for and codes have been added.
+    /// `codeDictionary` as a hash table, which every message needs: the slot of a code is its remainder or
+    /// the next free one. Rebuilt lazily when codes have been added.
     mutable std::vector<Route> _routes;
     mutable std::size_t _routedCodes = 0;
 };

@@ -9,19 +9,19 @@ bool KeptRecords::keep(std::size_t view, Bytes bytes, Parts parts) {
     Kept& kept = _kept[view];
     kept.bytes.assign(bytes.begin(), bytes.end());
     kept.parts = parts;
-    kept.turn = ++_turns;
+    kept.order = ++_lastOrder;
     return (parts & ~kept.shown) != 0;
 }
 
 void KeptRecords::dropAllBut(std::size_t view) {
     for (std::size_t i = 0; i < _kept.size(); ++i)
         if (i != view)
-            _kept[i].turn = 0;
+            _kept[i].order = 0;
 }
 
 void KeptRecords::clear() {
     for (Kept& kept : _kept) {
-        kept.turn = 0;
+        kept.order = 0;
         kept.shown = 0;
     }
 }
@@ -29,7 +29,7 @@ void KeptRecords::clear() {
 std::size_t KeptRecords::earliest() const {
     std::size_t found = none;
     for (std::size_t i = 0; i < _kept.size(); ++i)
-        if (_kept[i].isPending() && (found == none || _kept[i].turn < _kept[found].turn))
+        if (_kept[i].isPending() && (found == none || _kept[i].order < _kept[found].order))
             found = i;
     return found;
 }

@@ -14,9 +14,10 @@ namespace velmora {
 /// The latest record of each view (each log code) of a section, until it is written into the display.
 ///
 /// A display is handed out every two seconds and its records arrive dozens of times in between, so that text
-/// is made of the last of them only. Nothing that is shown depends on when that happens: records are written
-/// in the order of their arrival, one that sets less than the one it would replace is not kept in its place,
-/// and one whose labels may not be there yet is written at once, which settles the order of the keys.
+/// is made from the last of them only. Nothing that is shown depends on when that happens: records are
+/// written in the order of their arrival, one that sets less than the one that it would replace does not
+/// replace it, and one whose labels may not be there yet is written at once, which fixes the order of the
+/// keys.
 ///
 /// Keeping a record allocates nothing once there has been one as long.
 class KeptRecords {
@@ -26,10 +27,10 @@ public:
 
     struct Kept {
         std::vector<std::uint8_t> bytes;
-        std::uint64_t turn = 0; ///< the place in the order of arrival; 0 when there is nothing to write
-        Parts parts = 0;        ///< of the record that is kept
-        Parts shown = 0;        ///< of all that have been written
-        [[nodiscard]] bool isPending() const { return turn != 0; }
+        std::uint64_t order = 0; ///< of arrival, from 1; 0 when there is nothing to write
+        Parts parts = 0;         ///< of the record that is kept
+        Parts shown = 0;         ///< of all that have been written
+        [[nodiscard]] bool isPending() const { return order != 0; }
     };
 
     explicit KeptRecords(std::size_t views = 0) : _kept(views) {}
@@ -37,7 +38,7 @@ public:
 
     [[nodiscard]] const Kept& operator[](std::size_t view) const { return _kept[view]; }
 
-    /// Whether what is pending has to be written before a record with these parts takes the view's place.
+    /// Whether what is pending has to be written before a record with these parts replaces it.
     [[nodiscard]] bool wouldLose(std::size_t view, Parts parts) const {
         return _kept[view].isPending() && (_kept[view].parts & ~parts) != 0;
     }
@@ -45,7 +46,7 @@ public:
     [[nodiscard]] bool keep(std::size_t view, Bytes bytes, Parts parts);
     /// Nothing is pending but, perhaps, this view: it replaces what the others would write.
     void dropAllBut(std::size_t view);
-    void drop(std::size_t view) { _kept[view].turn = 0; }
+    void drop(std::size_t view) { _kept[view].order = 0; }
     /// Nothing is pending, and nothing has been written: the display is another.
     void clear();
 
@@ -56,18 +57,18 @@ public:
         for (std::size_t view = earliest(); view != none; view = earliest()) {
             Kept& kept = _kept[view];
             write(view, Bytes(kept.bytes));
-            kept.turn = 0;
+            kept.order = 0;
             kept.shown |= kept.parts;
         }
     }
 
 private:
     static constexpr std::size_t none = ~std::size_t{0};
-    /// The view whose pending record came first; none where nothing is pending.
+    /// The view whose pending record arrived first; none where nothing is pending.
     [[nodiscard]] std::size_t earliest() const;
 
     std::vector<Kept> _kept;
-    std::uint64_t _turns = 0;
+    std::uint64_t _lastOrder = 0;
 };
 
 } // namespace velmora

@@ -26,7 +26,7 @@ LogGenerator::LogGenerator(const Clock& clock) : _clock(clock) {
     logFormat(LogPriority::Warning, "Creating Log object: %p", static_cast<void*>(this));
 }
 
-void LogGenerator::updateStateTelling(Dictionary& state, const Data& data, MessageEffects& effects) {
+void LogGenerator::updateStateReporting(Dictionary& state, const Data& data, MessageEffects& effects) {
     updateState(state, data);
     effects.display(display(state));
 }

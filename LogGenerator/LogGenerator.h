@@ -13,8 +13,8 @@ namespace velmora {
 
 class MessageEffects;
 
-/// A technology's log decoder, as the model speaks to it. Decoders keep what they decode in the state
-/// dictionary that every call is given: the model owns it and it outlives them, so that a new decoder
+/// A technology's log decoder, as the model uses it. Decoders keep what they decode in the state
+/// dictionary that every call gets: the model owns it and it outlives them, so that a new decoder
 /// continues from the earlier one's values. Main thread only.
 ///
 /// State keys that every decoder uses: "Display" (the latest display dictionary), "DisplayState" (the raw
@@ -31,13 +31,13 @@ public:
     /// Decodes one log message into the state. Called for every message.
     virtual void updateState(Dictionary& state, const Data& data) = 0;
     /// `updateState`, and reports what the message concerned. The default reports the entire display.
-    virtual void updateStateTelling(Dictionary& state, const Data& data, MessageEffects& effects);
+    virtual void updateStateReporting(Dictionary& state, const Data& data, MessageEffects& effects);
     /// The display for the current state, or none when there is nothing to show yet; appends a history entry.
     /// Called once per redraw with new data.
     [[nodiscard]] virtual Value generateLogUsingState(Dictionary& state) = 0;
-    /// The display as it stands, none where it has not been built; nothing else happens. A decoder may keep
-    /// records until the display is asked for, so that "Display" in the state may lack what came last: it is
-    /// looked at through this alone.
+    /// The current display, none where it has not been built; nothing else happens. A decoder may keep
+    /// records until the display is requested, so that "Display" in the state may lack the latest ones: read
+    /// it through this function only.
     [[nodiscard]] virtual Value display(Dictionary& state);
     /// The property-list dictionary that makes the telephony service stream this technology's messages.
     [[nodiscard]] virtual DictionaryRef getStartCommand() const = 0;

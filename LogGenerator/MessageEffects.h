@@ -30,7 +30,7 @@ public:
     /// A value key and its value, whether or not a label shows it.
     virtual void value(std::string_view key, const Value& value) = 0;
 
-    /// The message concerned the display as a whole; none where there is none.
+    /// The message concerned the entire display; none where there is none.
     virtual void display(const Value& display) = 0;
 };
 

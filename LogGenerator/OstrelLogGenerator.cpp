@@ -41,8 +41,8 @@ std::optional<Data> OstrelLogGenerator::generateDlfFromState(const Dictionary& s
             }
             if (raw->size() < 2)
                 continue;
-            // Only the buffer's first byte, a type byte, goes; those of its further messages stay. That is
-            // how the file is written, and it is kept.
+            // Only the buffer's first byte, a type byte, is removed, and not those of its further messages,
+            // on purpose.
             const Bytes rest = raw->bytes().subspan(1);
             dlf.insert(dlf.end(), rest.begin(), rest.end());
         }
@@ -64,7 +64,7 @@ ArrayRef OstrelLogGenerator::getSaveContentsFromState(const Dictionary& state) c
     return contents;
 }
 
-void OstrelLogGenerator::keepRefresh(Dictionary& state) {
+void OstrelLogGenerator::endRefresh(Dictionary& state) {
     if (!keepsHistory())
         return;
     const std::size_t usual = _binData.size();

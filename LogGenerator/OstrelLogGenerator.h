@@ -30,7 +30,7 @@ protected:
     std::vector<std::uint8_t> _binData;
 
     /// Appends a message to them, where a history is kept.
-    void keep(const Data& message) {
+    void keepMessage(const Data& message) {
         if (!keepsHistory())
             return;
         const Bytes bytes = message.bytes();
@@ -39,7 +39,7 @@ protected:
 
     /// Ends a refresh: moves the raw messages into the state under "DisplayState", starts a new collection
     /// and appends to the history, where one is kept.
-    void keepRefresh(Dictionary& state);
+    void endRefresh(Dictionary& state);
 };
 
 } // namespace velmora

@@ -57,23 +57,23 @@ OstrelLogGenerator2::~OstrelLogGenerator2() {
     } catch (const std::exception& failure) {
         logFormat(LogPriority::Error, "the display lacks its last records: %s", failure.what());
     }
-    // The same words for every technology.
+    // The same text for every technology.
     logFormat(LogPriority::Warning, "Ostrel_GSMLogGenerator is destructed %p", static_cast<void*>(this));
 }
 
 void OstrelLogGenerator2::updateState(Dictionary& state, const Data& data) {
     // Builds the display on the first message.
-    if (!_sectionsHaveNodes || !state.contains("Display"))
+    if (!_sectionsAttached || !state.contains("Display"))
         static_cast<void>(getDisplayFromState(state));
     updateWithData(data);
-    keep(data); // every message, routed or not, with its prefix
+    keepMessage(data); // every message, routed or not, with its prefix
 }
 
-void OstrelLogGenerator2::updateStateTelling(Dictionary& state, const Data& data, MessageEffects& effects) {
-    if (!_sectionsHaveNodes || !state.contains("Display"))
+void OstrelLogGenerator2::updateStateReporting(Dictionary& state, const Data& data, MessageEffects& effects) {
+    if (!_sectionsAttached || !state.contains("Display"))
         static_cast<void>(getDisplayFromState(state));
     const std::optional<std::uint32_t> code = route(data);
-    keep(data);
+    keepMessage(data);
     effects.sections(code);
     const std::vector<Base*>* subscribers = code ? cIndex->getSubscribers(*code) : nullptr;
     if (!subscribers)
@@ -103,7 +103,7 @@ std::optional<std::uint32_t> OstrelLogGenerator2::route(const Data& message) {
         stripped = message.from(LogMessage::prefixLength);
     const Data& data = stripped ? *stripped : message;
     if (const std::vector<Base*>* subscribers = cIndex->getSubscribers(code)) {
-        const CellList::OneRecord one(cIndex->cellList());
+        const CellList::SameRecordScope sameRecord(cIndex->cellList());
         for (Base* section : *subscribers)
             section->updateWithData(data, code);
     }
@@ -112,9 +112,9 @@ std::optional<std::uint32_t> OstrelLogGenerator2::route(const Data& message) {
 
 Value OstrelLogGenerator2::getDisplayFromState(Dictionary& state) {
     if (const Value& display = state["Display"]; !display.isNone()) {
-        if (!_sectionsHaveNodes)
-            adoptDisplay(display);
-        _sectionsHaveNodes = true;
+        if (!_sectionsAttached)
+            attachSections(display);
+        _sectionsAttached = true;
         cIndex->writeNodes();
         return display;
     }
@@ -133,22 +133,22 @@ Value OstrelLogGenerator2::getDisplayFromState(Dictionary& state) {
     printDict(display);
     state.set("Display", display);
     state.set("ExtraInfo", makeDictionary());
-    _sectionsHaveNodes = true;
+    _sectionsAttached = true;
     return {}; // not the display: see the header
 }
 
-void OstrelLogGenerator2::adoptDisplay(const Value& object) {
+void OstrelLogGenerator2::attachSections(const Value& object) {
     // The state outlives decoders. After a reconnection this decoder's sections have no nodes yet while the
-    // display of the earlier one is still shown: they go on in it, and nothing that it shows is lost.
+    // display of the earlier one is still shown: they continue in it, and nothing that it shows is lost.
     if (const Dictionary* dictionary = object.asDictionary()) {
         for (const auto& [key, value] : *dictionary) {
             if (Base* section = cIndex->getClass(key))
                 section->updateSectionRef(value);
-            adoptDisplay(value);
+            attachSections(value);
         }
     } else if (const Array* array = object.asArray()) {
         for (const Value& element : *array)
-            adoptDisplay(element);
+            attachSections(element);
     }
 }
 
@@ -168,7 +168,7 @@ Value OstrelLogGenerator2::processTemplate(const Value& object) {
         for (const auto& [key, value] : *object.asDictionary()) {
             Value processed = processTemplate(value);
             if (processed.isNone())
-                continue; // a foreign kind has been reported; its key is left out
+                continue; // a foreign kind has been reported; its key is skipped
             if (Base* section = cIndex->getClass(key))
                 section->updateSectionRef(processed);
             result->set(key, std::move(processed));
@@ -198,7 +198,7 @@ void OstrelLogGenerator2::printDict(const Value& object) const {
 
 Value OstrelLogGenerator2::generateLogUsingState(Dictionary& state) {
     Value display = getDisplayFromState(state);
-    keepRefresh(state);
+    endRefresh(state);
     return display;
 }
 

@@ -28,13 +28,13 @@ public:
 
     void updateState(Dictionary& state, const Data& data) override;
     /// Reports the subscribers of the message's code.
-    void updateStateTelling(Dictionary& state, const Data& data, MessageEffects& effects) override;
+    void updateStateReporting(Dictionary& state, const Data& data, MessageEffects& effects) override;
     [[nodiscard]] Value generateLogUsingState(Dictionary& state) override;
     [[nodiscard]] Value display(Dictionary& state) override;
     [[nodiscard]] DictionaryRef getStartCommand() const override;
 
     /// Frames one message and routes its record. A message below 13 bytes as it arrived is dropped silently;
-    /// a prefix (first byte 0x81, two bytes) is removed; so a prefixed message of 13 bytes gives a record of
+    /// a prefix (first byte 0x81, two bytes) is removed; so a prefixed message of 13 bytes has a record of
     /// 11, which each section then finds too short.
     void updateWithData(const Data& message);
 
@@ -51,14 +51,14 @@ public:
     [[nodiscard]] const ClassIndex& classIndex() const { return *cIndex; }
 
 private:
-    /// Does what `updateWithData` does. Gives the code; none for a message that was dropped.
+    /// Does what `updateWithData` does. Returns the code; none for a message that was dropped.
     std::optional<std::uint32_t> route(const Data& message);
-    /// Gives the sections of this decoder their nodes of a display that an earlier decoder built.
-    void adoptDisplay(const Value& object);
+    /// Sets the nodes of this decoder's sections to those of a display that an earlier decoder built.
+    void attachSections(const Value& object);
 
     std::string pListName;
     std::shared_ptr<ClassIndex> cIndex;
-    bool _sectionsHaveNodes = false;
+    bool _sectionsAttached = false;
 };
 
 } // namespace velmora

@@ -10,8 +10,9 @@
 
 namespace velmora {
 
-/// One log code that a section wants, and what it reads there: a table, or more than a table says, which the
-/// section's `decode` then names. A section's views are its subscriptions, in the order of registration.
+/// One log code that a section subscribes to, and what it reads there: a table, or more than a table
+/// describes, which the section's `decode` then names. A section's views are its subscriptions, in the order
+/// of registration.
 struct View {
     /// A table, which must be a constant.
     constexpr View(std::uint32_t logCode, const Layout& layout)

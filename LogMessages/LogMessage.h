@@ -40,8 +40,8 @@ struct LogMessage {
     static constexpr std::uint32_t firstExtraCode = 0xFF0000;
 
     bool prefixed = false;
-    std::uint8_t type = 0;  ///< as it stands: `parse` does not judge it
-    std::uint16_t code = 0; ///< as it stands
+    std::uint8_t type = 0;  ///< unchanged: `parse` does not check it
+    std::uint16_t code = 0; ///< without the extra stream's 0xFF0000
     Bytes record;           ///< the message without its prefix
 
     /// Reads a message; none where it is shorter than a header. That is its length as it arrived, prefix
@@ -65,7 +65,7 @@ struct LogMessage {
     /// The code by which decoders subscribe.
     [[nodiscard]] std::uint32_t logCode() const { return (type == extraType ? firstExtraCode : 0) + code; }
 
-    /// The length field as it stands.
+    /// The length field, unchecked.
     [[nodiscard]] std::uint16_t length() const {
         return numberAt<std::uint16_t>(&record[lengthOffset], std::endian::little);
     }

@@ -12,7 +12,7 @@
 
 namespace velmora {
 
-/// Raised by the view of a counted list when an entry at or beyond its count is asked for.
+/// Raised by the view of a counted list for an entry at or beyond its count.
 class ArrayOutOfBoundsException : public std::exception {
 public:
     [[nodiscard]] const char* what() const noexcept override { return "array index out of bounds"; }
@@ -106,11 +106,11 @@ public:
     [[nodiscard]] std::size_t count() const { return _count; }
 
     /// Whether all of them lie inside the record, which takes no division.
-    [[nodiscard]] bool isWhole() const {
+    [[nodiscard]] bool isComplete() const {
         return _count == 0 || _record.has(_first + _stride * (_count - 1), _entryLength);
     }
     /// How many of them, from the first on, lie completely inside the record.
-    [[nodiscard]] std::size_t whole() const {
+    [[nodiscard]] std::size_t completeCount() const {
         if (!_record.has(_first, _entryLength))
             return 0;
         const std::size_t fitting = 1 + (_record.size() - _first - _entryLength) / _stride;
@@ -120,7 +120,7 @@ public:
     /// Entry `index`. Raises ArrayOutOfBoundsException for one at or beyond the count, and for one that the
     /// record does not hold.
     [[nodiscard]] Record operator[](std::size_t index) const {
-        if (index >= whole())
+        if (index >= completeCount())
             throw ArrayOutOfBoundsException();
         return _record.part(_first + _stride * index, _entryLength);
     }
@@ -129,7 +129,7 @@ public:
     [[nodiscard]] std::size_t stride() const { return _stride; }
     /// The record's bytes from the first entry to the end of the last complete one.
     [[nodiscard]] Record entries() const {
-        const std::size_t count = whole();
+        const std::size_t count = completeCount();
         return count == 0 ? Record(Bytes()) : _record.part(_first, _stride * (count - 1) + _entryLength);
     }
 

@@ -57,7 +57,7 @@ std::optional<Time> timeOfRecord(std::uint64_t timestamp) {
     const auto parts = static_cast<std::int64_t>(timestamp & 0xFFFF);
     const nanoseconds rest((parts * unit.count() + chipPartsPerUnit / 2) / chipPartsPerUnit);
     const Time systemTime = epoch + units * unit + rest;
-    // The last leap whose new second has come; within the inserted second itself UTC stands at that leap.
+    // The last leap second before the time; within the inserted second UTC stops at the leap.
     seconds ahead(std::ssize(leaps));
     for (; ahead.count() > 0; --ahead) {
         const Time leap = leaps[ahead.count() - 1];

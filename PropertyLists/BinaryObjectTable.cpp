@@ -82,8 +82,8 @@ Result<BinaryObject> BinaryObjectTable::object(std::uint64_t index) const {
         return failureAt(entry, "object " + std::to_string(index) + " lies at " + std::to_string(offset) +
                                     ", not from " + std::to_string(magic.size()) + " to " +
                                     std::to_string(_table - 1));
-    const auto place = static_cast<std::size_t>(offset);
-    return BinaryObject{place, _input[place], place + 1, 0};
+    const auto start = static_cast<std::size_t>(offset);
+    return BinaryObject{start, _input[start], start + 1, 0};
 }
 
 /// The count is in the marker's low half or, where that is 15, in an integer object after the marker.

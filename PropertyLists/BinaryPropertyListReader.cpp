@@ -15,7 +15,7 @@ namespace velmora {
 namespace {
 
 /// Reads one list. Objects are looked up by their index in the offset table, again for each reference, so
-/// that no two places of the result share a node. A function that fails returns false and has set the reason.
+/// that no two parts of the result share a node. A function that fails returns false and has set the reason.
 class Reader {
 public:
     Reader(const BinaryObjectTable& table, const PropertyListLimits& limits)
@@ -215,7 +215,7 @@ bool Reader::readDictionary(const BinaryObject& object, std::size_t depth, Value
     const auto count = static_cast<std::size_t>(object.count);
     auto dictionary = makeDictionary();
     for (std::size_t i = 0; i < count; ++i) {
-        // All keys stand first, then all values.
+        // All keys come first, then all values.
         const std::size_t keyReference = object.content + i * _table.referenceSize();
         const std::size_t valueReference = keyReference + count * _table.referenceSize();
         Value key;

@@ -17,8 +17,8 @@ namespace {
 
 constexpr std::size_t maximumDepth = PropertyListLimits{}.maximumDepth;
 
-/// Writes one list in two passes: the first gives every object its index (a text that stands in several
-/// places is one object), the second, which then knows how wide a reference is, writes the objects in that
+/// Writes one list in two passes: the first assigns every object its index (a text that occurs several
+/// times is one object), the second, when the width of a reference is known, writes the objects in that
 /// order.
 class Writer {
 public:
@@ -58,7 +58,7 @@ private:
         std::size_t firstReference = 0;
     };
 
-    /// 1, 2, 4 or 8: the widths that every reader knows.
+    /// 1, 2, 4 or 8: the widths that every reader supports.
     static std::size_t widthOf(std::size_t number) {
         if (number <= 0xFF)
             return 1;
@@ -73,8 +73,8 @@ private:
     }
 
     bool collectText(const std::string& text, std::size_t& index) {
-        const auto [place, added] = _indexOfText.try_emplace(text, _objects.size());
-        index = place->second;
+        const auto [entry, added] = _indexOfText.try_emplace(text, _objects.size());
+        index = entry->second;
         if (!added)
             return true;
         if (const auto invalid = firstInvalidUTF8(text))

@@ -75,11 +75,11 @@ void Dictionary::setText(std::string_view key, std::string_view text) {
     slot(key).setText(text);
 }
 
-Value& Dictionary::slotAt(std::size_t place, std::string_view key) {
+Value& Dictionary::slotAt(std::size_t index, std::string_view key) {
     expectMutable();
-    if (place < _entries.size() && _entries[place].key == key)
-        return _entries[place].value;
-    truncate(place);
+    if (index < _entries.size() && _entries[index].key == key)
+        return _entries[index].value;
+    truncate(index);
     return add(key);
 }
 

@@ -27,7 +27,7 @@ public:
     };
 
     Dictionary() = default;
-    /// Sets each entry in turn, so that a key given twice keeps its first place and its last value.
+    /// Sets each entry in order, so that a repeated key keeps its first position and its last value.
     Dictionary(std::initializer_list<Entry> entries);
 
     [[nodiscard]] std::size_t size() const { return _entries.size(); }
@@ -41,16 +41,16 @@ public:
     /// The value under `key`, or none.
     [[nodiscard]] const Value& operator[](std::string_view key) const;
 
-    /// Stores the value; a key that is already there keeps its place in the order.
+    /// Stores the value; a key that is already there keeps its position in the order.
     void set(std::string_view key, Value value);
     /// `set` with a string, without giving up the storage of one that is there already.
     void setText(std::string_view key, std::string_view text);
     /// The value under `key`, to be changed; none for a key that was not there.
     [[nodiscard]] Value& slot(std::string_view key);
-    /// The value of the entry at `place`, to be changed, for who writes all entries anew in order: an entry
-    /// of another key that stands there is removed with all after it. Precondition: place <= size(), and no
-    /// entry before has that key.
-    [[nodiscard]] Value& slotAt(std::size_t place, std::string_view key);
+    /// The value of the entry at `index`, to be changed, for writing all entries again in order: an entry of
+    /// another key at that index is removed with all after it. Precondition: index <= size(), and no earlier
+    /// entry has that key.
+    [[nodiscard]] Value& slotAt(std::size_t index, std::string_view key);
     /// Removes all entries from `count` on.
     void truncate(std::size_t count);
     /// Whether there was such a key.
@@ -69,16 +69,16 @@ private:
     };
     static constexpr std::size_t nowhere = ~std::size_t{0};
 
-    /// The key's place in `_entries`, or nowhere.
+    /// The key's index in `_entries`, or nowhere.
     [[nodiscard]] std::size_t indexOf(std::string_view key) const;
     Value& add(std::string_view key);
     void rebuildIndex();
     void expectMutable() const;
 
     std::vector<Entry> _entries;
-    /// Key to place in `_entries`; empty while there are few entries.
+    /// Key to index in `_entries`; empty while there are few entries.
     std::unordered_map<std::string, std::size_t, Hash, std::equal_to<>> _index;
-    /// The place after the entry set last: a table is written in order, so its next key most often is there.
+    /// The index after the entry set last: a table is written in order, so its next key is usually there.
     std::size_t _next = 0;
     bool _frozen = false;
 };

@@ -29,12 +29,12 @@ struct PropertyListLimits {
 /// anything after the root value but white space are refused, and so are dates outside the years 0001 to
 /// 9999; fractions of a date's second are dropped. Values that are referenced several times are copied, and
 /// the total size of their text and data is limited to that of the largest input. A duplicate key of a
-/// dictionary keeps its first position and its last value. A reason gives the offset in the input where it
+/// dictionary keeps its first position and its last value. A reason names the offset in the input where it
 /// has one.
 Result<Value> readPropertyList(Bytes input, const PropertyListLimits& limits = {});
 
 /// The XML form, version 1.0. Fails for what the form cannot represent: no value, a string with a control
-/// character that XML does not know or that is not UTF-8, a date outside the years 0001 to 9999, nesting
+/// character that XML does not allow or that is not UTF-8, a date outside the years 0001 to 9999, nesting
 /// deeper than the reader's default limit (which a value that contains itself exceeds).
 Result<std::string> writeXMLPropertyList(const Value& root);
 

@@ -23,14 +23,14 @@ using DictionaryRef = std::shared_ptr<Dictionary>;
 /// The kinds of value; none is the kind of a Value that holds nothing.
 enum class ValueKind : std::uint8_t { None, String, Integer, Real, Boolean, Date, Data, Array, Dictionary };
 
-/// A point in time as a property list carries it: whole seconds, UTC.
+/// A point in time as in a property list: whole seconds, UTC.
 using Date = std::chrono::sys_seconds;
 
 /// A property-list value: string, integer, real, boolean, date, data, array, dictionary, or none.
 ///
-/// Scalars are held by value. Arrays and dictionaries are shared by reference: copying the Value gives a
+/// Scalars are held by value. Arrays and dictionaries are shared by reference: copying the Value makes a
 /// second reference to the same node, so that a decoder section and the display hold the same object.
-/// `copy()` gives an independent one. Main thread only, as everything that holds nodes.
+/// `copy()` returns an independent one. Main thread only, as everything that holds nodes.
 class Value {
 public:
     using Kind = ValueKind;
@@ -46,14 +46,14 @@ public:
     Value(double real) : _held(real) {}
     Value(Date date) : _held(date) {}
     Value(Data data) : _held(std::move(data)) {}
-    /// A null reference gives none: every array or dictionary that a Value reports exists.
+    /// A null reference makes none: every array or dictionary that a Value reports exists.
     Value(ArrayRef array);
     Value(DictionaryRef dictionary);
 
     [[nodiscard]] Kind kind() const { return static_cast<Kind>(_held.index()); }
     [[nodiscard]] bool isNone() const { return kind() == Kind::None; }
 
-    /// Each gives the held value, or null where the value is of another kind. Nothing is converted.
+    /// Each returns the held value, or null where the value is of another kind. Nothing is converted.
     [[nodiscard]] const std::string* asString() const { return std::get_if<std::string>(&_held); }
     [[nodiscard]] const std::int64_t* asInteger() const { return std::get_if<std::int64_t>(&_held); }
     [[nodiscard]] const double* asReal() const { return std::get_if<double>(&_held); }

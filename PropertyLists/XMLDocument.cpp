@@ -46,8 +46,9 @@ Result<Done> XMLDocument::parse(Bytes input, const PropertyListLimits& limits) {
     if (const auto offset = firstNotXML(_text))
         return failureAt(*offset, "no character of XML in UTF-8");
 
-    // Text comes as it stands in the document: pugixml would pass unknown references as text and end a string
-    // at "&#0;". White space is kept because it may be part of a string that has comments or sections in it.
+    // Text is read unchanged from the document: pugixml would pass unknown references as text and end a
+    // string at "&#0;". White space is kept because it may be part of a string that has comments or sections
+    // in it.
     constexpr unsigned options = pugi::parse_cdata | pugi::parse_eol | pugi::parse_ws_pcdata |
                                  pugi::parse_embed_pcdata | pugi::parse_fragment;
     const PugixmlMemoryBudget budget(documentBytes(limits.maximumObjects));

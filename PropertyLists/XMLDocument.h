@@ -15,7 +15,7 @@
 
 namespace velmora {
 
-/// An XML document and its text, which pugixml parses in place, so that every node knows its offset in the
+/// An XML document and its text, which pugixml parses in place, so that every node has its offset in the
 /// input. It stays where it is made: its nodes point into it.
 class XMLDocument {
 public:
@@ -27,7 +27,7 @@ public:
     [[nodiscard]] Result<Done> parse(Bytes input, const PropertyListLimits& limits);
 
     [[nodiscard]] pugi::xml_node root() const { return _document.root(); }
-    /// Where in the input an element's "<", or a piece of text, stands.
+    /// The offset in the input of an element's "<", or of a text.
     [[nodiscard]] std::size_t offsetOf(pugi::xml_node node) const;
     /// As above, for text of this document.
     [[nodiscard]] std::size_t offsetOf(std::string_view text) const {

@@ -75,7 +75,7 @@ private:
 };
 
 /// The next element after `element`, or the first one where that is null; null at the end. Only white space
-/// may stand between elements.
+/// may be between elements.
 bool Reader::nextElement(pugi::xml_node parent, pugi::xml_node& element) {
     element = element ? element.next_sibling() : parent.first_child();
     while (element && element.type() != pugi::node_element) {

@@ -48,7 +48,7 @@ private:
             case '&': _output += "&amp;"; break;
             case '<': _output += "&lt;"; break;
             case '>': _output += "&gt;"; break;
-            // A reader takes a bare carriage return for a line feed.
+            // A reader turns a bare carriage return into a line feed.
             default: _output += "&#13;"; break;
             }
             text.remove_prefix(plain + 1);

@@ -49,7 +49,7 @@ std::optional<char32_t> characterOf(std::string_view digits, int base) {
     return number;
 }
 
-/// The character that a reference's name (what stands between "&" and ";") means.
+/// The character that a reference's name (what is between "&" and ";") means.
 std::optional<char32_t> referenced(std::string_view name) {
     if (name == "lt")
         return U'<';

@@ -25,7 +25,7 @@ struct XMLInteger {
 [[nodiscard]] XMLInteger integerOfXML(std::string_view text);
 
 /// A decimal number, with or without exponent, or "nan", "inf" or "infinity", with or without sign, white
-/// space around it. Numbers that no double comes near are refused.
+/// space around it. Numbers outside the range of a double are refused.
 [[nodiscard]] std::optional<double> realOfXML(std::string_view text);
 /// The shortest decimal text that reads as the same number; "nan", "+infinity", "-infinity".
 [[nodiscard]] std::string xmlOfReal(double real);

@@ -39,7 +39,7 @@ Value loadTemplate() {
     return *root;
 }
 
-/// Hands values on to who wants to know what a message published.
+/// Reports the values that a message published.
 class EffectsVisitor final : public C2K::ValueVisitor {
 public:
     explicit EffectsVisitor(MessageEffects& effects) : _effects(effects) {}
@@ -95,7 +95,7 @@ void C2KLogGenerator::updateState(Dictionary& state, const Data& data) {
     update(state, data, nullptr);
 }
 
-void C2KLogGenerator::updateStateTelling(Dictionary& state, const Data& data, MessageEffects& effects) {
+void C2KLogGenerator::updateStateReporting(Dictionary& state, const Data& data, MessageEffects& effects) {
     update(state, data, &effects);
 }
 
@@ -113,8 +113,8 @@ void C2KLogGenerator::updateFromLog(const Data& data, const DictionaryRef& looku
         effects->values(message ? std::optional(message->logCode()) : std::nullopt);
     if (!message)
         return;
-    // Despite its last word the record is decoded on; only the codes of the extra stream, for which the line
-    // is written as well, match no parser. Both are meant.
+    // On purpose the record is decoded although the line says "Dropping"; only the codes of the extra stream,
+    // for which the line is written as well, match no parser.
     if (message->type != LogMessage::basebandType)
         logFormat(LogPriority::Error, "Invalid log type: %x. Dropping.",
                   static_cast<unsigned>(message->type));
@@ -129,13 +129,13 @@ void C2KLogGenerator::updateFromLog(const Data& data, const DictionaryRef& looku
         _readings.use(lookup);
         _readings.keep(*parser, *reading);
     }
-    keep(message->prefixed ? data.from(LogMessage::prefixLength) : data);
+    keepMessage(message->prefixed ? data.from(LogMessage::prefixLength) : data);
 }
 
 Value C2KLogGenerator::generateLogUsingState(Dictionary& state) {
     _readings.write();
     Value display = getDisplayFromState(state);
-    keepRefresh(state);
+    endRefresh(state);
     return display;
 }
 

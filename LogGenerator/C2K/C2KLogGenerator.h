@@ -9,10 +9,10 @@
 namespace velmora {
 
 /// The decoder of the technology Ostrel CDMA (CDMA2000 1x and EV-DO). It has no sections: the template
-/// "C2KTemplate" says which value stands under which label, and eight parsers, one a log code, put their
-/// values there through the lookup that is made of it. The generator holds nothing but the raw records since
-/// the last display and the latest reading of each parser, until the display is handed out; all else is in
-/// the state, so that a new decoder goes on where an earlier one ended.
+/// "C2KTemplate" defines which value is shown under which label, and eight parsers, one a log code, put their
+/// values there through the lookup that is built from it. The generator holds nothing but the raw records
+/// since the last display and the latest reading of each parser, until the display is handed out; all else is
+/// in the state, so that a new decoder continues where an earlier one ended.
 ///
 /// State keys beside LogGenerator's: "Template" (the template as it was loaded), "Lookup" (value key to array
 /// of {"key": label, "dict": the display dictionary that holds it}), and the parsers' running values:
@@ -27,8 +27,8 @@ public:
 
     [[nodiscard]] DictionaryRef getStartCommand() const override;
     void updateState(Dictionary& state, const Data& data) override;
-    /// Tells of the values that the message published.
-    void updateStateTelling(Dictionary& state, const Data& data, MessageEffects& effects) override;
+    /// Reports the values that the message published.
+    void updateStateReporting(Dictionary& state, const Data& data, MessageEffects& effects) override;
     [[nodiscard]] Value generateLogUsingState(Dictionary& state) override;
     [[nodiscard]] Value display(Dictionary& state) override;
 
@@ -41,11 +41,11 @@ public:
 
     /// Fills display and lookup from a template: a dictionary becomes a sub-screen, "_sorted" is copied, any
     /// other string is the value key that its label shows and an empty text until there is a value. Values of
-    /// other kinds are left out.
+    /// other kinds are skipped.
     static void processTemplate(const Dictionary& source, const DictionaryRef& display, Dictionary& lookup);
 
     /// The state's display, which the first call builds; none, with an error line, where there is no template
-    /// (it is looked for again on the next call). What a decoder keeps is not written yet: see `display`.
+    /// (the next call looks it up again). What a decoder keeps is not written yet: see `display`.
     [[nodiscard]] static Value getDisplayFromState(Dictionary& state);
 
 private:

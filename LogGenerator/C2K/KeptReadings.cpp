@@ -13,7 +13,8 @@ KeptReadings::KeptReadings()
       _numbers(logCodeParsers().size() * Reading::mostParts) {}
 
 void KeptReadings::use(const DictionaryRef& lookup) {
-    // A later lookup may lie where one lay that is gone: that it is the same one takes both.
+    // A new lookup may have the address of one that was destroyed, so that the address alone does not
+    // identify it.
     if (lookup.get() == _used && !_lookup.owner_before(lookup) && !lookup.owner_before(_lookup))
         return;
     write();
@@ -25,7 +26,7 @@ void KeptReadings::use(const DictionaryRef& lookup) {
 void KeptReadings::keep(const LogCodeParser& parser, const Reading& reading) {
     if (_lookup.expired())
         return;
-    const std::size_t first = placeOf(parser) * Reading::mostParts;
+    const std::size_t first = indexOf(parser) * Reading::mostParts;
     bool isNew = false;
     for (std::size_t part = 0; part < Reading::mostParts; ++part) {
         if ((reading.parts >> part & 1) == 0)
@@ -42,9 +43,9 @@ void KeptReadings::write() {
     if (!lookup)
         return;
     LookupWriter writer(*lookup);
-    _records.writeAll([this, &writer](std::size_t place, Bytes bytes) {
-        const Reading reading{Record(bytes), _numbers[place], 1U << place % Reading::mostParts};
-        logCodeParsers()[place / Reading::mostParts]->decode(reading, writer);
+    _records.writeAll([this, &writer](std::size_t index, Bytes bytes) {
+        const Reading reading{Record(bytes), _numbers[index], 1U << index % Reading::mostParts};
+        logCodeParsers()[index / Reading::mostParts]->decode(reading, writer);
     });
 }
 

@@ -24,9 +24,9 @@ struct Reading {
     static constexpr std::size_t mostParts = 2;
 };
 
-/// Turns the records of one log code into values, which go by value keys ("kChannel") in place of labels. A
-/// parser keeps nothing itself: values that run on from record to record live in the state dictionary, which
-/// outlives decoders.
+/// Turns the records of one log code into values, which have value keys ("kChannel") instead of labels. A
+/// parser keeps nothing itself: values that accumulate from record to record are in the state dictionary,
+/// which outlives decoders.
 class LogCodeParser {
 public:
     virtual ~LogCodeParser() = default;
@@ -34,7 +34,7 @@ public:
     LogCodeParser& operator=(const LogCodeParser&) = delete;
 
     [[nodiscard]] virtual std::uint16_t logCode() const = 0;
-    /// What people call such records.
+    /// What such records are called.
     [[nodiscard]] virtual std::string_view name() const = 0;
     /// Takes one record, prefix removed, of whatever length, on arrival: checks it, logs what is wrong with
     /// it, and updates the running values. None for a record that publishes nothing; one that is rejected

@@ -38,7 +38,7 @@ std::span<const LogCodeParser* const> logCodeParsers() {
     return parsers;
 }
 
-std::size_t placeOf(const LogCodeParser& parser) {
+std::size_t indexOf(const LogCodeParser& parser) {
     const std::span<const LogCodeParser* const> all = logCodeParsers();
     return static_cast<std::size_t>(std::find(all.begin(), all.end(), &parser) - all.begin());
 }

@@ -14,8 +14,8 @@ namespace velmora::C2K {
 /// All parsers, in the order in which the start command names their codes.
 [[nodiscard]] std::span<const LogCodeParser* const> logCodeParsers();
 
-/// The place of a parser among them.
-[[nodiscard]] std::size_t placeOf(const LogCodeParser& parser);
+/// The index of a parser among them.
+[[nodiscard]] std::size_t indexOf(const LogCodeParser& parser);
 
 /// The parser of that code; null when there is none.
 [[nodiscard]] const LogCodeParser* parserOfCode(std::uint32_t logCode);

@@ -13,7 +13,7 @@
 
 namespace velmora::C2K {
 
-/// When a field means something. One that does not is not read and shows "N/A".
+/// When a field is valid. One that is not valid is not read and shows "N/A".
 enum class Validity : std::uint8_t { Always, WhileConnected };
 
 /// One row of a parser's table, in publishing order. The field's label is a value key.

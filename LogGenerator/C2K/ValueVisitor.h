@@ -12,8 +12,8 @@
 namespace velmora::C2K {
 
 /// Gathers what the parsers name into one value a value key: a text, or for a numbered list a dictionary in
-/// which each entry shows under its PN offset, in the order of the keys ("%d;%d": place in the record, PN
-/// offset), which the marker "_sorted" asks for.
+/// which each entry shows under its PN offset, in the order of the keys ("%d;%d": index in the record, PN
+/// offset), as the marker "_sorted" requests.
 class ValueVisitor : public FieldVisitor {
 public:
     void fields(const Record& record, const Layout& layout) final;

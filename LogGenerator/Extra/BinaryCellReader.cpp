@@ -106,8 +106,8 @@ private:
     [[nodiscard]] bool hasReferences(const Object& container, std::size_t anEntry) const {
         return container.count <= (_table - container.content) / (anEntry * _referenceWidth);
     }
-    [[nodiscard]] std::size_t reference(const Object& container, std::size_t place) const {
-        return static_cast<std::size_t>(number(container.content + place * _referenceWidth, _referenceWidth));
+    [[nodiscard]] std::size_t reference(const Object& container, std::size_t index) const {
+        return static_cast<std::size_t>(number(container.content + index * _referenceWidth, _referenceWidth));
     }
 
     bool text(const Object& object, std::string_view& text) const {
@@ -121,13 +121,13 @@ private:
         return true;
     }
 
-    /// What a key means: the place of a number, or one of these.
+    /// What a key means: the index of a number, or one of these.
     static constexpr std::uint8_t technologyKey = cellNumberCount;
     static constexpr std::uint8_t typeKey = cellNumberCount + 1;
     static constexpr std::uint8_t otherKey = cellNumberCount + 2;
     static constexpr std::uint8_t unreadKey = 0xFF;
 
-    /// Each key is looked at once; the cells share them.
+    /// Each key is read once; the cells share them.
     bool readKey(std::size_t index, std::uint8_t& meaning) {
         const bool remembered = index < _keys.size();
         if (remembered && _keys[index] != unreadKey) {
@@ -138,7 +138,7 @@ private:
         std::string_view keyText;
         if (!object(index, key) || !text(key, keyText))
             return false;
-        meaning = placeOf(keyText, cellNumberKeys);
+        meaning = indexOf(keyText, cellNumberKeys);
         if (keyText == kVoxCellMonitorCellRadioAccessTechnology)
             meaning = technologyKey;
         else if (keyText == kVoxCellMonitorCellType)
@@ -173,7 +173,7 @@ private:
             if (kind.object != valueIndex) {
                 if (!text(value, valueText))
                     return false;
-                kind = {valueIndex, placeOf(valueText, cellTechnologies), placeOf(valueText, cellTypes)};
+                kind = {valueIndex, indexOf(valueText, cellTechnologies), indexOf(valueText, cellTypes)};
             }
             (key == technologyKey ? cell.kind.technology : cell.kind.type) =
                 key == technologyKey ? kind.technology : kind.type;
@@ -182,11 +182,11 @@ private:
         if (!text(value, valueText))
             return false;
         if (key < cellNumberCount)
-            cell.setNoNumber(key);
+            cell.clearNumber(key);
         return true;
     }
 
-    /// A text that says of which kind a cell is.
+    /// A text that names a technology or a type.
     struct Kind {
         std::size_t object = ~std::size_t{0};
         std::uint8_t technology = 0;

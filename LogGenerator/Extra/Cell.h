@@ -15,16 +15,16 @@
 
 namespace velmora {
 
-/// The place of a text in a list of texts; the list's length where it is not among them.
+/// The index of a text in a list of texts; the length of the list where it is not in it.
 template <std::size_t N>
-constexpr std::uint8_t placeOf(std::string_view text, const std::string_view (&texts)[N]) {
-    std::uint8_t place = 0;
-    while (place < N && texts[place] != text)
-        ++place;
-    return place;
+constexpr std::uint8_t indexOf(std::string_view text, const std::string_view (&texts)[N]) {
+    std::uint8_t index = 0;
+    while (index < N && texts[index] != text)
+        ++index;
+    return index;
 }
 
-/// The telephony service's keys for the numbers of a cell, of which a section may ask.
+/// The telephony service's keys for the numbers of a cell that a section may show.
 inline constexpr std::string_view cellNumberKeys[] = {
     kVoxCellMonitorMCC,      kVoxCellMonitorMNC,   kVoxCellMonitorLAC,    kVoxCellMonitorTAC,
     kVoxCellMonitorCellId,   kVoxCellMonitorARFCN, kVoxCellMonitorUARFCN, kVoxCellMonitorPID,
@@ -43,10 +43,10 @@ inline constexpr std::string_view cellTypes[] = {kVoxCellMonitorCellTypeServing,
 
 /// One of those keys; any other does not compile.
 struct CellKey {
-    std::uint8_t place;
+    std::uint8_t index;
 
-    consteval CellKey(std::string_view key) : place(placeOf(key, cellNumberKeys)) {
-        if (place == cellNumberCount)
+    consteval CellKey(std::string_view key) : index(indexOf(key, cellNumberKeys)) {
+        if (index == cellNumberCount)
             throw "a key that is none of a cell's numbers";
     }
 };
@@ -58,7 +58,7 @@ struct CellKind {
 
     CellKind() = default;
     consteval CellKind(std::string_view technologyText, std::string_view typeText)
-        : technology(placeOf(technologyText, cellTechnologies)), type(placeOf(typeText, cellTypes)) {
+        : technology(indexOf(technologyText, cellTechnologies)), type(indexOf(typeText, cellTypes)) {
         if (technology == std::size(cellTechnologies) || type == std::size(cellTypes))
             throw "an unknown technology or type";
     }
@@ -71,19 +71,19 @@ struct Cell {
     std::uint32_t present = 0; ///< bit by bit, which numbers it has
     std::array<std::int32_t, cellNumberCount> numbers;
 
-    [[nodiscard]] bool has(CellKey key) const { return (present >> key.place & 1) != 0; }
+    [[nodiscard]] bool has(CellKey key) const { return (present >> key.index & 1) != 0; }
     [[nodiscard]] std::optional<std::int32_t> number(CellKey key) const {
-        return has(key) ? std::optional(numbers[key.place]) : std::nullopt;
+        return has(key) ? std::optional(numbers[key.index]) : std::nullopt;
     }
-    /// Takes a number in; one that 32 bits do not hold is none.
-    void setNumber(std::size_t place, std::int64_t number) {
+    /// Sets a number; one that does not fit 32 bits is absent.
+    void setNumber(std::size_t index, std::int64_t number) {
         const bool fits = number >= std::numeric_limits<std::int32_t>::min() &&
                           number <= std::numeric_limits<std::int32_t>::max();
-        numbers[place] = static_cast<std::int32_t>(number);
-        present = (present & ~(1u << place)) | std::uint32_t{fits} << place;
+        numbers[index] = static_cast<std::int32_t>(number);
+        present = (present & ~(1u << index)) | std::uint32_t{fits} << index;
     }
-    /// What stands there is no number.
-    void setNoNumber(std::size_t place) { present &= ~(1u << place); }
+    /// The value under that key is no number.
+    void clearNumber(std::size_t index) { present &= ~(1u << index); }
 };
 
 } // namespace velmora

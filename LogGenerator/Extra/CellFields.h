@@ -14,7 +14,7 @@ namespace velmora {
 
 /// Which part of a cell's number is shown.
 enum class CellNumber : std::uint8_t {
-    Whole,      ///< as it stands
+    Whole,      ///< all of it, unchanged
     Low16,      ///< the low 16 bits, unsigned
     SignedLow16 ///< the low 16 bits, signed
 };

@@ -16,13 +16,13 @@ namespace {
 /// A longer payload is read again by every section, and so not cached.
 constexpr std::size_t longestKept = std::size_t{1} << 16;
 
-/// A cell of the array as the property-list reader gave it.
+/// A cell of the array as the property-list reader returned it.
 Cell cellOf(const Dictionary& fields) {
     Cell cell;
     if (const std::string* text = fields[kVoxCellMonitorCellRadioAccessTechnology].asString())
-        cell.kind.technology = placeOf(*text, cellTechnologies);
+        cell.kind.technology = indexOf(*text, cellTechnologies);
     if (const std::string* text = fields[kVoxCellMonitorCellType].asString())
-        cell.kind.type = placeOf(*text, cellTypes);
+        cell.kind.type = indexOf(*text, cellTypes);
     for (std::size_t i = 0; i < cellNumberCount; ++i)
         if (const auto number = cellNumber(fields, cellNumberKeys[i]))
             cell.setNumber(i, *number);
@@ -36,7 +36,7 @@ const std::vector<Cell>* CellList::read(const Data& record) {
         return &_cells;
     if (!readPayload(record))
         return nullptr;
-    _isRead = _isOneRecord;
+    _isRead = _isSameRecord;
     return &_cells;
 }
 
@@ -53,7 +53,7 @@ bool CellList::readPayload(const Data& record) {
     }
     if (!good) {
         _cells.clear();
-        if (!readSlowly(record))
+        if (!readAsPropertyList(record))
             return false;
     }
     if (payload.size() <= longestKept)
@@ -61,7 +61,7 @@ bool CellList::readPayload(const Data& record) {
     return true;
 }
 
-bool CellList::readSlowly(const Data& record) {
+bool CellList::readAsPropertyList(const Data& record) {
     const CellInfoArrayReader reader(record);
     const Array* cells = reader.parsed().asArray();
     if (!cells)

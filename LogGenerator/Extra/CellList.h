@@ -16,18 +16,18 @@ namespace velmora {
 /// sections of a class index.
 class CellList {
 public:
-    /// The cells of the record, in the list's order, but what is no cell; null where the payload holds no
+    /// The cells of the record, in the list's order, without what is no cell; null where the payload holds no
     /// array or cannot be read, which then is logged as CellInfoArrayReader does. Valid until the next call.
     [[nodiscard]] const std::vector<Cell>* read(const Data& record);
 
-    /// As long as it lives, every call of `read` is for one and the same record, so that it need not be
-    /// compared with the last.
-    class OneRecord {
+    /// During its lifetime every call of `read` is for the same record, which need not be compared with the
+    /// last one then.
+    class SameRecordScope {
     public:
-        explicit OneRecord(CellList& cells) : _cells(cells) { _cells._isOneRecord = true; }
-        ~OneRecord() { _cells._isOneRecord = _cells._isRead = false; }
-        OneRecord(const OneRecord&) = delete;
-        OneRecord& operator=(const OneRecord&) = delete;
+        explicit SameRecordScope(CellList& cells) : _cells(cells) { _cells._isSameRecord = true; }
+        ~SameRecordScope() { _cells._isSameRecord = _cells._isRead = false; }
+        SameRecordScope(const SameRecordScope&) = delete;
+        SameRecordScope& operator=(const SameRecordScope&) = delete;
 
     private:
         CellList& _cells;
@@ -35,13 +35,13 @@ public:
 
 private:
     [[nodiscard]] bool readPayload(const Data& record);
-    [[nodiscard]] bool readSlowly(const Data& record);
+    [[nodiscard]] bool readAsPropertyList(const Data& record);
 
     std::vector<std::uint8_t> _payload; ///< that `_cells` were read from; empty before
     std::vector<Cell> _cells;
     XMLCellReader _xmlReader;
-    bool _isOneRecord = false;
-    bool _isRead = false; ///< the one record has been
+    bool _isSameRecord = false;
+    bool _isRead = false; ///< the same record has been
 };
 
 /// The first cell of that kind, or null.

@@ -18,7 +18,7 @@ namespace velmora {
 struct CellTable {
     enum class Shown : std::uint8_t {
         First, ///< the first cell of the kinds, in the section's dictionary
-        Last,  ///< every cell of the kinds in turn, in the section's dictionary: of a label the last counts
+        Last,  ///< every cell of the kinds, in the section's dictionary: the last one overwrites
         Rows   ///< every cell of the kinds, a row each in the section's list
     };
 
@@ -34,7 +34,7 @@ inline constexpr View cellInformation{ExtraCode::cellInformation, std::size_t{0}
 /// all sections of a class index; what is kept until it is written is the section's own cells of it.
 class CellSection : public Base {
 public:
-    /// Has the section read the array together with others.
+    /// Reads the array through a list that is shared with other sections.
     void shareCellList(std::shared_ptr<CellList> cells) { _cells = std::move(cells); }
 
     void updateWithData(const Data& data, std::uint32_t logCode) override;

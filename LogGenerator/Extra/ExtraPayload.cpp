@@ -16,7 +16,7 @@ namespace velmora {
 
 namespace {
 
-constexpr std::size_t longestRemembered = std::size_t{1} << 16;
+constexpr std::size_t longestCached = std::size_t{1} << 16;
 
 Result<Value> readPayload(const Data& record) {
     return readPropertyList(record.from(LogMessage::headerLength).bytes());
@@ -29,21 +29,21 @@ bool holds(const Dictionary& cell, std::string_view key, std::string_view text) 
 
 } // namespace
 
-Result<Value> RememberedPayloads::read(const Data& record) {
+Result<Value> PayloadCache::read(const Data& record) {
     const Bytes bytes = record.from(LogMessage::headerLength).bytes();
     for (const Payload& known : _payloads)
         if (!known.value.isNone() &&
             std::equal(bytes.begin(), bytes.end(), known.bytes.begin(), known.bytes.end()))
             return known.value;
     Result<Value> payload = readPayload(record);
-    if (payload && bytes.size() <= longestRemembered) {
+    if (payload && bytes.size() <= longestCached) {
         _payloads[_next] = {{bytes.begin(), bytes.end()}, *payload};
         _next = (_next + 1) % _payloads.size();
     }
     return payload;
 }
 
-LogCode_0xFF0000::SIMFileReader::SIMFileReader(const Data& record, RememberedPayloads& earlier) {
+LogCode_0xFF0000::SIMFileReader::SIMFileReader(const Data& record, PayloadCache& earlier) {
     Result<Value> payload = earlier.read(record);
     if (!payload) {
         logLine(LogPriority::Error, "SIM File dictionary data could not be constructed");
@@ -57,7 +57,7 @@ const Value* LogCode_0xFF0000::SIMFileReader::value(std::string_view key) const 
     return files ? files->find(key) : nullptr;
 }
 
-ContextListReader::ContextListReader(const Data& record, RememberedPayloads& earlier) {
+ContextListReader::ContextListReader(const Data& record, PayloadCache& earlier) {
     Result<Value> payload = earlier.read(record);
     if (payload && payload->asArray())
         _contexts = *std::move(payload);

@@ -16,14 +16,14 @@
 
 namespace velmora {
 
-/// The extra stream's payload readers. Each is built from a whole record, reads the property list after the
-/// 13-byte header and keeps the result.
+/// The extra stream's payload readers. Each is built from a complete record, reads the property list after
+/// the 13-byte header and keeps the result.
 
 /// A cache of a section's latest payloads and their values. The SIM's files and the contexts are sent
 /// repeatedly without having changed, or as before, alternately in both forms: some of them are cached.
-class RememberedPayloads {
+class PayloadCache {
 public:
-    /// What the record's payload holds, as readPropertyList gives it.
+    /// What the record's payload holds, as readPropertyList returns it.
     [[nodiscard]] Result<Value> read(const Data& record);
 
 private:
@@ -32,7 +32,7 @@ private:
         Value value;
     };
     std::array<Payload, 8> _payloads;
-    std::size_t _next = 0; ///< which is forgotten next
+    std::size_t _next = 0; ///< which is replaced next
 };
 
 namespace LogCode_0xFF0000 {
@@ -49,7 +49,7 @@ public:
 class SIMFileReader {
 public:
     /// Logs and raises UnknownDataException when the payload cannot be read.
-    SIMFileReader(const Data& record, RememberedPayloads& earlier);
+    SIMFileReader(const Data& record, PayloadCache& earlier);
     /// The value under `key`; null when there is none.
     [[nodiscard]] const Value* value(std::string_view key) const;
     /// What the payload holds, whatever its kind.
@@ -64,7 +64,7 @@ private:
 /// The packet-data contexts: an array, or nothing where the payload is anything else or unreadable.
 class ContextListReader {
 public:
-    ContextListReader(const Data& record, RememberedPayloads& earlier);
+    ContextListReader(const Data& record, PayloadCache& earlier);
     [[nodiscard]] const Value& contexts() const { return _contexts; }
 
 private:
@@ -87,13 +87,13 @@ private:
     Value _parsed;
 };
 
-/// Whether `cell` is a dictionary whose radio access technology and cell type are the two given. One that
-/// lacks either key is of none.
+/// Whether `cell` is a dictionary whose radio access technology and cell type are these two. One that
+/// lacks either key is not.
 [[nodiscard]] bool isCell(const Value& cell, std::string_view technology, std::string_view type);
 
 /// A cell's number as a signed 32-bit integer. Absent where the key is missing or its value does not convert:
-/// text, data and booleans are no numbers, and a number that 32 bits or a whole number cannot hold would show
-/// as another one.
+/// text, data and booleans are no numbers, and a number that has a fraction or does not fit 32 bits would
+/// show as another one.
 [[nodiscard]] std::optional<std::int32_t> cellNumber(const Dictionary& cell, std::string_view key);
 
 } // namespace velmora

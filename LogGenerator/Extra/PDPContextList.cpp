@@ -11,6 +11,7 @@ namespace velmora {
 namespace {
 
 constexpr View contextViews[] = {{ExtraCode::packetDataContexts, std::size_t{0}}};
+// As the telephony service reports them.
 constexpr List contextList{"", List::Entries::Values, ""};
 constexpr Field context{"", computed, plainText()};
 

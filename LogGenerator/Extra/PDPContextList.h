@@ -8,8 +8,8 @@
 
 namespace velmora {
 
-/// "PDP Context Info": the active packet-data contexts, one row each, as the telephony service words them.
-/// Shared by the technologies.
+/// "PDP Context Info": the active packet-data contexts, one row each, with the texts of the telephony
+/// service. Shared by the technologies.
 class PDPContextList final : public Base {
 public:
     [[nodiscard]] std::string_view getSectionName() const override { return "PDP Context Info"; }
@@ -20,7 +20,7 @@ public:
 private:
     void trace() const override;
 
-    RememberedPayloads _payloads;
+    PayloadCache _payloads;
     Value _contexts; ///< of the record that is kept: an array
 };
 

@@ -21,6 +21,8 @@ struct SIMFile {
     Field field;
 };
 
+/// Most of them are elementary files of 3GPP TS 31.102 and TS 51.011; which there are, and with which text,
+/// is as the telephony service reports it.
 constexpr SIMFile simFiles[] = {
     {"kSimFile_ICCID", "EF-ICCID"},
     {"kSimFile_MSISDN", "EF-MSISDN"},

@@ -8,7 +8,8 @@
 
 namespace velmora {
 
-/// "SIM Info": the SIM's elementary files, as the telephony service words them. Shared by the technologies.
+/// "SIM Info": the SIM's elementary files, with the texts of the telephony service. Shared by the
+/// technologies.
 class SimInfo final : public Base {
 public:
     [[nodiscard]] std::string_view getSectionName() const override { return "SIM Info"; }
@@ -20,7 +21,7 @@ public:
 private:
     void trace() const override;
 
-    RememberedPayloads _payloads;
+    PayloadCache _payloads;
     Value _files; ///< of the record that is kept
 };
 

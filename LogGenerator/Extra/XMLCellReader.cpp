@@ -12,7 +12,7 @@ namespace {
 constexpr std::string_view head = "<?xml version=\"1.0\" encoding=\"UTF-8\"?>\n<plist version=\"1.0\">\n";
 /// Well within every limit of the property-list reader.
 constexpr std::size_t maximumLength = std::size_t{1} << 20;
-constexpr std::size_t maximumStretchLength = 2048;
+constexpr std::size_t maximumSegmentLength = 2048;
 constexpr std::size_t maximumDigits = 18;
 
 /// Takes tags and texts off the front of a list.
@@ -36,7 +36,7 @@ public:
         passSpace();
         return take(token);
     }
-    /// Plain text up to the closing tag, which goes too.
+    /// Plain text up to the closing tag, which is removed too.
     [[nodiscard]] bool text(std::string_view closing, std::string_view& text) {
         std::size_t end = 0;
         while (end < _rest.size() && _rest[end] >= ' ' && _rest[end] <= '~' && _rest[end] != '<' &&
@@ -71,61 +71,61 @@ bool XMLCellReader::read(std::string_view text, std::vector<Cell>& cells) {
     if (text.size() > maximumLength)
         return false;
     for (std::size_t at = 0;;) {
-        const Stretch* stretch = stretchAt(text.substr(at), at == 0);
-        if (!stretch)
+        const Segment* segment = segmentAt(text.substr(at), at == 0);
+        if (!segment)
             return false;
-        at += stretch->text.size();
-        for (const Step& step : stretch->steps) {
+        at += segment->text.size();
+        for (const Step& step : segment->steps) {
             switch (step.kind) {
             case Step::Kind::BeginCell: cells.emplace_back(); break;
             case Step::Kind::Technology: cells.back().kind.technology = step.value; break;
             case Step::Kind::Type: cells.back().kind.type = step.value; break;
-            case Step::Kind::NotANumber: cells.back().setNoNumber(step.value); break;
+            case Step::Kind::NotANumber: cells.back().clearNumber(step.value); break;
             }
         }
-        if (stretch->number == noNumber)
+        if (segment->number == noNumber)
             return at == text.size();
         std::int64_t number = 0;
         const std::size_t length = numberLength(text.substr(at), number);
         if (length == 0)
             return false;
         at += length;
-        if (stretch->number != unknownNumber)
-            cells.back().setNumber(stretch->number, number);
+        if (segment->number != unknownNumber)
+            cells.back().setNumber(segment->number, number);
     }
 }
 
-const XMLCellReader::Stretch* XMLCellReader::stretchAt(std::string_view rest, bool begins) {
-    const auto fits = [&](std::size_t place) {
-        return place < _stretches.size() && _stretches[place].begins == begins &&
-               rest.starts_with(_stretches[place].text);
+const XMLCellReader::Segment* XMLCellReader::segmentAt(std::string_view rest, bool begins) {
+    const auto fits = [&](std::size_t index) {
+        return index < _segments.size() && _segments[index].begins == begins &&
+               rest.starts_with(_segments[index].text);
     };
-    std::size_t found = _last < _stretches.size() ? _stretches[_last].next : 0;
+    std::size_t found = _last < _segments.size() ? _segments[_last].next : 0;
     if (!fits(found)) {
-        for (found = 0; found < _stretches.size() && !fits(found);)
+        for (found = 0; found < _segments.size() && !fits(found);)
             ++found;
-        if (found == _stretches.size()) {
-            if (_stretches.size() == maximumStretches)
-                _stretches.clear(); // what still comes is learnt again
-            if (!learn(rest, begins))
+        if (found == _segments.size()) {
+            if (_segments.size() == maximumSegments)
+                _segments.clear(); // what follows is cached again
+            if (!addSegment(rest, begins))
                 return nullptr;
-            found = _stretches.size() - 1;
+            found = _segments.size() - 1;
         }
-        if (_last < _stretches.size())
-            _stretches[_last].next = found;
+        if (_last < _segments.size())
+            _segments[_last].next = found;
     }
     _last = found;
-    return &_stretches[found];
+    return &_segments[found];
 }
 
 /// Parses the segment at the start of `rest`. There is a current cell, unless the list starts.
-bool XMLCellReader::learn(std::string_view rest, bool begins) {
-    Stretch stretch;
-    stretch.begins = begins;
-    const auto note = [&stretch](Step::Kind kind, std::size_t value) {
-        stretch.steps.push_back({kind, static_cast<std::uint8_t>(value)});
+bool XMLCellReader::addSegment(std::string_view rest, bool begins) {
+    Segment segment;
+    segment.begins = begins;
+    const auto note = [&segment](Step::Kind kind, std::size_t value) {
+        segment.steps.push_back({kind, static_cast<std::uint8_t>(value)});
     };
-    Tokens tokens(rest.substr(0, maximumStretchLength));
+    Tokens tokens(rest.substr(0, maximumSegmentLength));
     if (begins) {
         if (!tokens.take(head) || !tokens.tag("<array>") || !tokens.tag("<dict>"))
             return false;
@@ -148,26 +148,26 @@ bool XMLCellReader::learn(std::string_view rest, bool begins) {
         std::string_view value;
         if (!tokens.tag("<key>") || !tokens.text("</key>", key))
             return false;
-        const std::size_t number = placeOf(key, cellNumberKeys);
+        const std::size_t number = indexOf(key, cellNumberKeys);
         if (tokens.tag("<integer>")) {
             // A number is neither technology nor type.
             if (key == kVoxCellMonitorCellRadioAccessTechnology || key == kVoxCellMonitorCellType)
                 return false;
-            stretch.number = number < cellNumberCount ? static_cast<std::uint8_t>(number) : unknownNumber;
+            segment.number = number < cellNumberCount ? static_cast<std::uint8_t>(number) : unknownNumber;
             break;
         }
         if (!tokens.tag("<string>") || !tokens.text("</string>", value))
             return false;
         if (key == kVoxCellMonitorCellRadioAccessTechnology)
-            note(Step::Kind::Technology, placeOf(value, cellTechnologies));
+            note(Step::Kind::Technology, indexOf(value, cellTechnologies));
         else if (key == kVoxCellMonitorCellType)
-            note(Step::Kind::Type, placeOf(value, cellTypes));
+            note(Step::Kind::Type, indexOf(value, cellTypes));
         else if (number < cellNumberCount)
             note(Step::Kind::NotANumber, number);
     }
-    const std::size_t length = std::min(rest.size(), maximumStretchLength) - tokens.rest().size();
-    stretch.text = rest.substr(0, length);
-    _stretches.push_back(std::move(stretch));
+    const std::size_t length = std::min(rest.size(), maximumSegmentLength) - tokens.rest().size();
+    segment.text = rest.substr(0, length);
+    _segments.push_back(std::move(segment));
     return true;
 }
 

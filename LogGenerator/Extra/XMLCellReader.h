@@ -26,7 +26,7 @@ public:
     [[nodiscard]] bool read(std::string_view text, std::vector<Cell>& cells);
 
 private:
-    static constexpr std::size_t maximumStretches = 64;
+    static constexpr std::size_t maximumSegments = 64;
     static constexpr std::uint8_t noNumber = 0xFF; ///< the list ends here
     static constexpr std::uint8_t unknownNumber = 0xFE;
 
@@ -36,18 +36,18 @@ private:
         Kind kind = Kind::BeginCell;
         std::uint8_t value = 0;
     };
-    struct Stretch {
+    struct Segment {
         std::string text;
         bool begins = false; ///< it is at the list's start, not after a number
         std::vector<Step> steps;
-        std::uint8_t number = noNumber; ///< the place of the number that follows
+        std::uint8_t number = noNumber; ///< the index of the number that follows
         std::size_t next = 0;           ///< which segment followed last time
     };
 
-    [[nodiscard]] const Stretch* stretchAt(std::string_view rest, bool begins);
-    [[nodiscard]] bool learn(std::string_view rest, bool begins);
+    [[nodiscard]] const Segment* segmentAt(std::string_view rest, bool begins);
+    [[nodiscard]] bool addSegment(std::string_view rest, bool begins);
 
-    std::vector<Stretch> _stretches;
+    std::vector<Segment> _segments;
     std::size_t _last = 0; ///< the one that was met last
 };
 

@@ -13,14 +13,14 @@
 namespace velmora {
 
 /// Writes the text of each field into a section's node of the display: fields under their labels into a
-/// dictionary, the section's own list into an array. What is named for a node of the other kind is left out.
+/// dictionary, the section's own list into an array. What is named for a node of the other kind is ignored.
 ///
 /// A list is written over the one of the record before: what nothing else refers to is filled again, and rows
 /// that a shorter list leaves are kept for the next longer one, so that a list that is shown after each
 /// record keeps its storage. What has been handed out stays as it is.
 class DisplayWriter final : public FieldVisitor {
 public:
-    /// The rows that lists have no place for, from writing to writing.
+    /// The rows that shorter lists do not use, kept for later ones.
     using SpareRows = std::vector<Value>;
 
     DisplayWriter(Dictionary& node, SpareRows& spare) : _spare(spare) { _levels[0].dictionary = &node; }
@@ -41,11 +41,11 @@ public:
     void endList() override;
 
 private:
-    /// A dictionary or list that is being written; none of the two where it goes nowhere.
+    /// A dictionary or list that is being written; neither where it is ignored.
     struct Level {
         Dictionary* dictionary = nullptr;
         Array* list = nullptr;
-        std::size_t next = 0; ///< the place of the next entry in a list or row
+        std::size_t next = 0; ///< the index of the next entry in a list or row
         bool isRow = false;
     };
     /// The section's node, a list, a row, a list in it, and a row there.

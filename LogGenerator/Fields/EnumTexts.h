@@ -16,7 +16,7 @@ struct EnumText {
     std::string_view text;
 };
 
-/// An enumeration's texts in ascending order of value, holes left out, and what every other value shows: one
+/// An enumeration's texts in ascending order of value, with gaps, and what every other value shows: one
 /// fixed text, or the value itself (signed, 32 bits) between two texts, as in "[Reserved 7]".
 class EnumTexts {
 public:

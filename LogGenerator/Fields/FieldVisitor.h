@@ -14,9 +14,9 @@ namespace velmora {
 
 class Value;
 
-/// What a decode function names the fields of a record to, in the order in which the display shows them. What
-/// is made of them - the display's text, the value that a tool is told - is the visitor's affair; a decode
-/// function has no other effect and may be called any number of times for the same record.
+/// What a decode function names the fields of a record to, in the order in which the display shows them. The
+/// visitor turns them into the display's texts or a tool's values; a decode function has no other effect and
+/// may be called any number of times for the same record.
 ///
 /// Fields, lists and formats are constants. Texts and values are valid during the call only.
 class FieldVisitor {
@@ -25,7 +25,7 @@ public:
 
     /// All rows of a table, in table order. Precondition: the record has the layout's minimum length.
     virtual void fields(const Record& record, const Layout& layout) = 0;
-    /// A field by its raw value, for what no table reads.
+    /// A field by its raw value, which no table reads.
     virtual void number(const Field& field, std::int64_t raw) = 0;
     /// A field whose value is a real number, which its format shows without scale and offset.
     virtual void real(const Field& field, double value) = 0;
@@ -33,23 +33,23 @@ public:
     virtual void text(const Field& field, std::string_view text) = 0;
     /// A field whose value the telephony service supplies ready to be shown, of whatever kind.
     virtual void supplied(const Field& field, const Value& value) = 0;
-    /// The record says that the field of an earlier one does not hold any more.
+    /// The field of an earlier record is not valid any more.
     virtual void removed(std::string_view label) = 0;
 
-    /// A list begins, in place of the one that stood there; its entries follow. Lists nest in rows.
+    /// A list begins, which replaces an earlier one; its entries follow. Lists nest in rows.
     virtual void beginList(const List& list) = 0;
     /// A row begins; its fields follow. `List::Entries::Rows` only.
     virtual void beginRow() = 0;
     virtual void endRow() = 0;
-    /// The next value of a list has this number of its own and this place in the record.
+    /// The next value of a list has this number of its own and this index in the record.
     /// `List::Entries::Numbered` only.
     virtual void entryNumber(std::size_t index, std::uint16_t number) = 0;
     virtual void endList() = 0;
 
-    /// A list of one row for each entry that lies wholly inside the record, by a table.
+    /// A list of one row for each complete entry, by a table.
     void rows(const List& list, const CountedList& entries, const Layout& layout) {
         beginList(list);
-        for (std::size_t i = 0, count = entries.whole(); i < count; ++i) {
+        for (std::size_t i = 0, count = entries.completeCount(); i < count; ++i) {
             beginRow();
             fields(entries[i], layout);
             endRow();

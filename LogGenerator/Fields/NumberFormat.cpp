@@ -14,7 +14,7 @@ namespace velmora {
 namespace {
 
 /// Measured levels and ratios count in halves, quarters, sixteenths ... of a unit. Such a number, below 2^24
-/// with at most 16 binary places, is shown by whole numbers, in a fifth of the time that another takes.
+/// with at most 16 binary places, is shown with integer arithmetic, in a fifth of the time.
 constexpr double binaryPlaces = 65'536;
 constexpr double countLimit = 1'099'511'627'776; // 2^40: times 10^6 stays below 2^60
 constexpr std::uint64_t powersOfTen[] = {1, 10, 100, 1'000, 10'000, 100'000, 1'000'000};

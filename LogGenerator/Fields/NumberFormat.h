@@ -18,7 +18,7 @@ struct NumberFormat {
     bool plus = false;          ///< a sign also before what is not negative
     std::uint8_t width = 0;     ///< at least so many characters, filled with blanks on the left
     std::uint8_t precision = 6; ///< decimals of 'f'
-    std::string_view prefix;    ///< what stands before the number
+    std::string_view prefix;    ///< what precedes the number
     std::string_view suffix;    ///< what follows the number
 
     consteval NumberFormat(const char* format) : suffix(format) {
@@ -61,8 +61,8 @@ private:
     }
 };
 
-/// A shown number in storage of its own: long enough for every double that a record's fields can give with up
-/// to 60 characters around it.
+/// A shown number in storage of its own: long enough for every double that a record's fields can result in,
+/// with up to 60 characters around it.
 class NumberText {
 public:
     NumberText() {} // the storage is not initialized

@@ -11,7 +11,7 @@
 namespace velmora {
 
 /// Where a field lies in its record or entry, and how its bits are read. Made by the functions below; the
-/// default is the place of a value that a section computes.
+/// default is for a value that a section computes.
 struct Place {
     std::uint16_t offset = 0; ///< of the byte that holds the lowest bit (of the first byte, big-endian)
     std::uint8_t bit = 0;     ///< the lowest bit's number in that byte
@@ -26,7 +26,7 @@ struct Place {
     [[nodiscard]] std::int64_t read(const Record& record) const;
 };
 
-/// The place of a value that stands nowhere in the record as it is shown.
+/// For a value that is not in the record as it is shown.
 inline constexpr Place computed{};
 
 consteval Place u8At(std::uint16_t offset) {

@@ -8,8 +8,8 @@
 namespace velmora {
 
 FormattedText::FormattedText(const TextFormat& format, std::int64_t raw) {
-    if (format.hasException && raw == format.exception) {
-        _view = format.exceptionText;
+    if (format.hasSpecial && raw == format.specialValue) {
+        _view = format.specialText;
         return;
     }
     switch (format.kind) {

@@ -22,9 +22,9 @@ struct TextFormat {
     const EnumTexts* texts = nullptr;
     std::string_view set;   ///< a flag's text when it is not zero
     std::string_view clear; ///< a flag's text when it is zero
-    bool hasException = false;
-    std::int64_t exception = 0; ///< the raw value that shows `exceptionText` instead
-    std::string_view exceptionText;
+    bool hasSpecial = false;
+    std::int64_t specialValue = 0; ///< the raw value that shows `specialText` instead
+    std::string_view specialText;
 };
 
 /// Raw value times `scale` plus `offset`, in whole numbers, as "%d" or "%u" shows it.
@@ -82,9 +82,9 @@ consteval TextFormat plainText() {
 
 /// `otherwise`, but for the one raw value that has a text of its own.
 consteval TextFormat unless(std::int64_t raw, std::string_view text, TextFormat otherwise) {
-    otherwise.hasException = true;
-    otherwise.exception = raw;
-    otherwise.exceptionText = text;
+    otherwise.hasSpecial = true;
+    otherwise.specialValue = raw;
+    otherwise.specialText = text;
     return otherwise;
 }
 

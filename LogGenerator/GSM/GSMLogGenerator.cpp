@@ -10,7 +10,7 @@ namespace velmora {
 
 namespace {
 
-// The lines are those that the assertions are known by, wherever they stand now.
+// The line numbers identify the assertions to users and do not follow the source.
 constexpr const char* assertionFile = "LogGenerator/GSM/GSMLogGenerator";
 constexpr int unknownObjectLine = 78;
 constexpr int notDeserializedLine = 90;

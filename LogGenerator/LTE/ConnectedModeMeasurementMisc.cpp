@@ -12,6 +12,7 @@ using LTE::IntraFrequencyRecord;
 
 namespace {
 
+// EARFCN (3GPP TS 36.101 5.7.3), physical cell identity (TS 36.211 6.11); level and quality: see Records.h.
 constexpr Field servingFields[] = {
     {"E-ARFCN", u16At(17), integer("%d")},
     {"Serving Physical Cell ID", u16At(19), integer("%d")},

@@ -9,6 +9,7 @@ using LTE::IntraFrequencyRecord;
 
 namespace {
 
+// 0xB179: physical cell identity (3GPP TS 36.211 6.11).
 constexpr Field cellFields[] = {
     {"Physical Cell ID", u16At(0), integer("%d")},
 };

@@ -8,7 +8,7 @@
 
 namespace velmora {
 
-/// A list of cells that connected mode knows on the serving frequency, one row each; each record of the
+/// A list of cells that connected mode reports on the serving frequency, one row each; each record of the
 /// intra-frequency measurement replaces it.
 class IntraFrequencyList : public Base {
 public:

@@ -21,7 +21,7 @@ LTELogGenerator::LTELogGenerator(const Clock& clock)
     : OstrelLogGenerator2("LTE", createClassIndex(), clock) {}
 
 LTELogGenerator::~LTELogGenerator() {
-    // The base class says that a decoder of another name goes, too.
+    // The base class logs another line, with another class's name.
     logFormat(LogPriority::Warning, "LTELogGenerator is destructed %p", static_cast<void*>(this));
 }
 

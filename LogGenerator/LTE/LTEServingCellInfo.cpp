@@ -10,18 +10,21 @@ namespace velmora {
 
 namespace {
 
-/// By the number of resource blocks.
+/// By the number of resource blocks (3GPP TS 36.101 5.6).
 constexpr EnumText bandwidthRows[] = {
     {6, "1.4 MHz"}, {15, "3 MHz"}, {25, "5 MHz"}, {50, "10 MHz"}, {75, "15 MHz"}, {100, "20 MHz"},
 };
 constexpr EnumTexts bandwidths(bandwidthRows, "Unknown");
 
+// As the modem reports it.
 constexpr Field antennaFields[] = {
     {"Num Tx Antennas", u8At(20), integer("%d")},
 };
 constexpr Layout antennas = layout(22, antennaFields);
 constexpr std::uint32_t antennaCode = 0xB0C1;
 
+// Physical cell identity (3GPP TS 36.211 6.11), EARFCN and band (TS 36.101 5.7.3, 5.5), cell identity and TAC
+// (TS 23.003 19.6, 19.4.2.3).
 constexpr std::uint32_t cellCode = 0xB0C2;
 constexpr std::size_t cellMinimumLength = 38;
 constexpr Field carrierFields[] = {
@@ -37,6 +40,7 @@ constexpr Field identityFields[] = {
 };
 constexpr Layout identity = layout(cellMinimumLength, identityFields);
 
+// As the telephony service reports it.
 constexpr CellField servingCellFields[] = {
     {kVoxCellMonitorTAC, CellNumber::Whole, "Tracking Area Code", integer("%d"),
      "Serving Cell Info: Failed to retrieve TAC\n"},
@@ -74,7 +78,7 @@ const CellTable& LTEServingCellInfo::cellTable() const {
 }
 
 void LTEServingCellInfo::check(const View& view, const Record&) const {
-    // Shown, and reported as if it were unknown: both are meant.
+    // On purpose, it is shown and reported as unknown as well.
     if (view.code == antennaCode)
         unknownLogMessage(view.code);
 }
@@ -85,7 +89,7 @@ void LTEServingCellInfo::decode(const View& view, const Record& record, FieldVis
         return;
     }
     visitor.fields(record, carrier);
-    // The telephony service's name for the downlink frequency goes when the baseband's arrives.
+    // The baseband's downlink frequency replaces the telephony service's, which has another label.
     visitor.removed("UARFCN");
     visitor.fields(record, identity);
 }

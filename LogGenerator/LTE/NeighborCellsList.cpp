@@ -14,8 +14,9 @@ namespace {
 
 constexpr Place physicalCellID = bitsAt(0, 0, 9);
 
-// Meant as they stand: both antennas are read from the same bits, and an RSRP step is half a decibel, twice
-// the serving cell's.
+// Physical cell identity (3GPP TS 36.211 6.11), RSRP, RSRQ and RSSI (quantities of TS 36.214), Srxlev (TS
+// 36.304 5.2.3.2), all on the modem's own scales. On purpose, both antennas are read from the same bits, and
+// an RSRP step is half a decibel, twice the serving cell's.
 constexpr Field cellFields[] = {
     {"Physical Cell ID", physicalCellID, integer("%d")},
     {"Measured RSSI", bitsAt(1, 1, 8), real("%4.2f dBm", 0.5, -140)},
@@ -58,7 +59,7 @@ void NeighborCellsList::check(const View& view, const Record& record) const {
     logFormat(LogPriority::Warning, "Number of neighboring cells being reported: %d\n",
               static_cast<int>(cells.count()));
     if (isLogged(LogPriority::Warning))
-        for (std::size_t i = 0; i < cells.whole(); ++i)
+        for (std::size_t i = 0; i < cells.completeCount(); ++i)
             traceCell(cells[i]);
     reportMissingEntries(cells, view.code);
 }

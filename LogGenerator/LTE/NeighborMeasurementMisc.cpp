@@ -12,6 +12,7 @@ using LTE::NeighborRecord;
 
 namespace {
 
+// EARFCN (3GPP TS 36.101 5.7.3); Q-RxLevMin in steps of 2 dB (TS 36.331), counted from -140 dBm by the modem.
 constexpr Field headerFields[] = {
     {"Version", u8At(13), integer("%d")},
     {"E-ARFCN", u16At(17), integer("%d")},

@@ -39,8 +39,10 @@ private:
     CountedList _detected;
 };
 
-/// How 0xB179 shows a filtered level and quality, of the serving cell and of the neighbours alike. The
-/// quality's offset differs from that of the idle-mode records (-30), as intended.
+/// How 0xB179 shows a filtered level and quality, of the serving cell and of the neighbours alike. RSRP and
+/// RSRQ are quantities of 3GPP TS 36.214 (5.1.1, 5.1.3); the scales are the modem's, not the steps of
+/// TS 36.133 9.1.4 and 9.1.7. The quality's offset differs from that of the idle-mode records (-30), on
+/// purpose.
 inline constexpr TextFormat filteredRSRP = real("%4.2f dBm", 0.25, -140);
 inline constexpr TextFormat filteredRSRQ = real("%4.2f dB", 0.125, -20);
 
@@ -65,12 +67,12 @@ private:
 
 /// 0xB186, the reselection candidates: a header, then a header of four bytes a candidate. The fields of the
 /// candidate's radio technology are read from after its header, where the next candidate's header lies: the
-/// entries overlap, as intended.
+/// entries overlap, on purpose.
 class ReselectionRecord {
 public:
     static constexpr std::uint32_t code = 0xB186;
     static constexpr std::size_t minimumLength = 21;
-    /// The low byte of a 16-bit field: 256 candidates count as none, as intended.
+    /// The low byte of a 16-bit field: 256 candidates count as none, on purpose.
     static constexpr Place count = u8At(19);
     static_assert(count.end() <= minimumLength);
     static constexpr std::size_t stride = 4;

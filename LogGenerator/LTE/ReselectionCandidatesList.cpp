@@ -14,12 +14,14 @@ using LTE::ReselectionRecord;
 
 namespace {
 
+// As the modem reports them.
 constexpr EnumText ratTypeRows[] = {
     {0, "LTE"}, {1, "UTRAN"}, {2, "GERAN"}, {3, "CDMA1XRTT"}, {4, "CDMAHRPD"},
 };
 constexpr EnumTexts ratTypes(ratTypeRows, "??");
 constexpr Place ratType = u16At(2);
 
+// Reselection priority (3GPP TS 36.304 5.2.4.1).
 constexpr Field headerFields[] = {
     {"Candidate Priority", u16At(0), integer("%d")},
     {"Candidate RAT Type", ratType, text(ratTypes)},
@@ -27,6 +29,9 @@ constexpr Field headerFields[] = {
 constexpr Layout header = layout(ReselectionRecord::stride, headerFields);
 
 // What belongs to the radio technology; offsets count from the candidate's header, like the header's own.
+// Channels and cells: EARFCN (3GPP TS 36.101 5.7.3), physical cell identity (TS 36.211 6.11); UARFCN (TS
+// 25.101 5.4.3), primary scrambling code (TS 25.213 5.2.2); ARFCN (TS 45.005 2), BSIC (TS 23.003 4.3.2); band
+// class (3GPP2 C.S0057), pilot PN offset (3GPP2 C.S0005). The GERAN band is the modem's number.
 constexpr Field lteFields[] = {
     {"E ARFCN", u16At(4), integer("%d")}, // with a blank, unlike the other sections' "E-ARFCN"
     {"Cell ID", bitsAt(6, 7, 9), integer("%d")},
@@ -58,10 +63,11 @@ const Layout& detailsOf(const Record& candidate) {
     return type < std::size(details) ? details[type] : noDetails;
 }
 
-/// How many candidates, from the first on, lie wholly inside the record with what belongs to their type.
-std::size_t wholeCandidates(const ReselectionRecord& reselection, const CountedList& headers) {
+/// How many candidates, from the first on, lie completely inside the record with what belongs to their type.
+std::size_t completeCandidates(const ReselectionRecord& reselection, const CountedList& headers) {
     std::size_t i = 0;
-    while (i < headers.whole() && i < reselection.candidates(detailsOf(headers[i]).minimumLength).whole())
+    while (i < headers.completeCount() &&
+           i < reselection.candidates(detailsOf(headers[i]).minimumLength).completeCount())
         ++i;
     return i;
 }
@@ -78,14 +84,14 @@ std::span<const View> ReselectionCandidatesList::views() const {
 void ReselectionCandidatesList::check(const View& view, const Record& record) const {
     const ReselectionRecord reselection(record);
     const CountedList headers = reselection.candidates(header.minimumLength);
-    reportMissingEntries(wholeCandidates(reselection, headers), headers.count(), view.code);
+    reportMissingEntries(completeCandidates(reselection, headers), headers.count(), view.code);
 }
 
 void ReselectionCandidatesList::decode(const View&, const Record& record, FieldVisitor& visitor) const {
     const ReselectionRecord reselection(record);
     const CountedList headers = reselection.candidates(header.minimumLength);
     visitor.beginList(rows);
-    for (std::size_t i = 0, count = wholeCandidates(reselection, headers); i < count; ++i) {
+    for (std::size_t i = 0, count = completeCandidates(reselection, headers); i < count; ++i) {
         const Layout& detail = detailsOf(headers[i]);
         visitor.beginRow();
         visitor.fields(headers[i], header);

@@ -12,6 +12,7 @@ using LTE::ReselectionRecord;
 
 namespace {
 
+// EARFCN (3GPP TS 36.101 5.7.3), physical cell identity (TS 36.211 6.11).
 constexpr Field headerFields[] = {
     {"Version", u8At(13), integer("%d")},
     {"Serving EARFCN", u16At(15), integer("%d")},

@@ -9,9 +9,14 @@ namespace velmora {
 
 namespace {
 
-// Meant as they stand: the maximum transmit power is compared with 64 although its 6 bits never reach it, of
-// the two searches the one is shown in dB and the other in dBm, and the RSRQ offset is not that of connected
-// mode (-20).
+// 0xB17F: EARFCN (3GPP TS 36.101 5.7.3), physical cell identity (TS 36.211 6.11), priority (TS 36.304
+// 5.2.4.1), Srxlev (5.2.3.2), the two searches (5.2.4.2), Q-RxLevMin and P-Max (TS 36.331); RSRP, RSRQ and
+// RSSI are quantities of TS 36.214. The scales are the modem's; for RSRP and RSRQ not the steps of TS 36.133
+// 9.1.4 and 9.1.7.
+//
+// On purpose, the maximum transmit power is compared with 64 although its 6 bits never reach it, of the two
+// searches the one is shown in dB and the other in dBm, and the RSRQ offset is not that of connected mode
+// (-20).
 constexpr Field measurementFields[] = {
     {"Version", u8At(13), integer("%d")},
     {"E-ARFCN", u16At(17), integer("%d")},
@@ -32,7 +37,7 @@ constexpr Field measurementFields[] = {
     {"Measurement Rules Updated", bitsAt(32, 1, 1), flag("True", "False")},
     {"Measurement Rules", bitsAt(32, 2, 4), integer("%d")},
 };
-constexpr Layout measurement = layout(33, measurementFields); // 0xB17F
+constexpr Layout measurement = layout(33, measurementFields);
 
 constexpr View sectionViews[] = {{0xB17F, measurement}};
 

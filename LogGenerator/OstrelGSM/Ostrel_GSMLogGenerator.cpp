@@ -21,7 +21,7 @@ Ostrel_GSMLogGenerator::Ostrel_GSMLogGenerator(const Clock& clock)
     : OstrelLogGenerator2("Ostrel_GSM", createClassIndex(), clock) {}
 
 Ostrel_GSMLogGenerator::~Ostrel_GSMLogGenerator() {
-    // The base class says the same once more.
+    // The base class logs the same line again.
     logFormat(LogPriority::Warning, "Ostrel_GSMLogGenerator is destructed %p", static_cast<void*>(this));
 }
 

@@ -10,6 +10,7 @@ namespace velmora::OstrelGSM {
 /// Tables that several sections of this technology read. Offsets count from the record's first byte, and a
 /// value outside an enumeration shows "Unknown".
 
+/// As the modem reports them.
 inline constexpr EnumText registrationStateRows[] = {
     {0, "REG_STATE_INACTIVE"},      {1, "REG_STATE_IDLE"},          {2, "REG_STATE_REGISTERING"},
     {3, "REG_STATE_DEREGISTERING"}, {4, "REG_STATE_MANUAL_SEARCH"}, {5, "REG_STATE_AUTOMATIC_SEARCH"},
@@ -17,6 +18,7 @@ inline constexpr EnumText registrationStateRows[] = {
 };
 inline constexpr EnumTexts registrationStates(registrationStateRows, "Unknown");
 
+/// The main states, with the numbers of 3GPP TS 24.008 4.1.2.1; the texts are the modem's.
 /// 1, 2, 4, 11, 12, 16 and 24 have no text of their own. The blanks inside 20 and 21 are part of the texts.
 inline constexpr EnumText mmStateRows[] = {
     {0, "MM_NULL"},
@@ -41,7 +43,7 @@ inline constexpr EnumText mmStateRows[] = {
 };
 inline constexpr EnumTexts mmStates(mmStateRows, "Unknown");
 
-/// 0x7132, registration: what `ProcessCS`, `ProcessPS` and `ProcessCO` show of it.
+/// 0x7132, registration, as the modem reports it: what `ProcessCS`, `ProcessPS` and `ProcessCO` show of it.
 inline constexpr Field registrationFields[] = {
     {"MM Service State", u8At(13), text(registrationStates)},
 };

@@ -12,13 +12,14 @@ namespace quality = UTRAN::quality;
 
 namespace {
 
+// 0xD00C: coded composite channel and time slot, as the modem reports them.
 constexpr Field channelFields[] = {
     {"CCTRCH ID", u8At(0), integer("%d")},
     {"TSNUM", u8At(1), integer("%d")},
 };
 constexpr Layout channel = layout(quality::compositeChannelLength, channelFields);
 
-/// The signal-to-interference ratios, as the modem reports them.
+/// SIR (a quantity of 3GPP TS 25.225), as the modem reports it.
 constexpr Field ratio[] = {
     {"", u8At(2), integer("%d")}, {"", u8At(3), integer("%d")}, {"", u8At(4), integer("%d")},
     {"", u8At(5), integer("%d")}, {"", u8At(6), integer("%d")}, {"", u8At(7), integer("%d")},
@@ -55,7 +56,7 @@ void CCTRCHSIRMeasurement::check(const View& view, const Record& record) const {
 void CCTRCHSIRMeasurement::decode(const View&, const Record& record, FieldVisitor& visitor) const {
     const CountedList channels = compositeChannels(record);
     visitor.beginList(rows);
-    for (std::size_t i = 0; i < channels.whole(); ++i) {
+    for (std::size_t i = 0; i < channels.completeCount(); ++i) {
         visitor.beginRow();
         visitor.fields(channels[i], channel);
         visitor.beginList(ratios);

@@ -14,6 +14,7 @@ constexpr std::size_t minimumLength = 17;
 constexpr Place count = u8At(16);
 static_assert(count.end() <= minimumLength);
 
+// NCC and BCC (3GPP TS 23.003 4.3.2), ARFCN (TS 45.005 2); the rest as the modem reports it.
 constexpr Field cellFields[] = {
     {"Cell ID", bitsAt(0, 0, 14), integer("%d")},
     {"Band Indicator", bitsAt(1, 6, 1), integer("%d")},

@@ -16,6 +16,7 @@ constexpr std::int64_t knownVersion = 1;
 /// What the mode reads as in a record of another version.
 constexpr std::int64_t noMode = 255;
 
+/// RRC states (3GPP TS 25.331 7.1), with the modem's own numbers.
 constexpr EnumText stateRows[] = {
     {0, "Disconnected"}, {1, "Connecting"}, {2, "Cell Fach"},
     {3, "Cell DCH"},     {4, "Cell PCH"},   {5, "Cell URA PCH"},
@@ -25,8 +26,8 @@ constexpr Field state{"State", u8At(14), text(states)};
 static_assert(state.place.end() <= expectedLength);
 
 /// The field of a record that may be too short for it.
-std::int64_t readOr(const Record& record, const Place& where, std::int64_t missing) {
-    return record.size() >= where.end() ? where.read(record) : missing;
+std::int64_t readOr(const Record& record, const Place& place, std::int64_t missing) {
+    return record.size() >= place.end() ? place.read(record) : missing;
 }
 
 /// A node on one line, as its log line shows it: {State = Cell DCH; Cells = (1, 2)}.

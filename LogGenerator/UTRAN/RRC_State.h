@@ -12,8 +12,8 @@ class RRC_State final : public Base {
 public:
     [[nodiscard]] std::string_view getSectionName() const override { return "RRC Info"; }
     [[nodiscard]] std::span<const View> views() const override;
-    /// A record below 15 bytes is warned of and decoded all the same: what it lacks reads as version 0 and as
-    /// mode 255, which is unknown.
+    /// A record below 15 bytes is logged as a warning and decoded as well: what it lacks reads as version 0
+    /// and as mode 255, which is unknown.
     void updateWithData(const Data& data, std::uint32_t logCode) override;
     void decode(const View& view, const Record& record, FieldVisitor& visitor) const override;
 

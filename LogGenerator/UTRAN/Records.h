@@ -21,8 +21,8 @@ static_assert(transportChannels.end() <= minimumLength && compositeChannels.end(
 /// The entries of the transport channels follow the minimum.
 inline constexpr std::size_t transportChannelLength = 2;
 
-/// Place the composite channels' entries begin. The 34 bytes that each transport channel moves them by are
-/// not what its entry takes; they are kept as they stand.
+/// The offset of the first composite channel's entry. The 34 bytes that each transport channel moves them by
+/// are not the length of its entry, on purpose.
 constexpr std::size_t firstCompositeChannel(std::size_t transportChannelCount) {
     return 289 + 34 * transportChannelCount;
 }

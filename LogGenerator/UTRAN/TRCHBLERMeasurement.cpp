@@ -12,6 +12,7 @@ namespace quality = UTRAN::quality;
 
 namespace {
 
+// 0xD00C: transport channel BLER (a quantity of 3GPP TS 25.225), as the modem reports it.
 constexpr Field channelFields[] = {
     {"TRCH ID", u8At(0), integer("%d")},
     {"TRCH BLER Measurement", u8At(1), integer("%d")},

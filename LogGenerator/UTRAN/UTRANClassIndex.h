@@ -16,7 +16,7 @@
 namespace velmora {
 
 /// The sections of the technology Ostrel UTRAN2. The fields are the list of sections: see ClassIndex. Its
-/// destruction says nothing of its own.
+/// destructor prints no line of its own.
 class UTRANClassIndex final : public ClassIndex {
 public:
     Held<RRC_State> rrc_state{*this};

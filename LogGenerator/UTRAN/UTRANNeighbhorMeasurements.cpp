@@ -17,7 +17,8 @@ static_assert(count.end() <= minimumLength);
 constexpr std::size_t firstEntry = 168;
 constexpr std::size_t entryLength = 16;
 
-// The fields stand bit by bit one after the other in the entry's first four bytes.
+// UARFCN (3GPP TS 25.102 5.4.3), cell parameter ID (TS 25.223), P-CCPCH RSCP (a quantity of TS 25.225) in the
+// modem's own steps of 1/256. The fields are packed into the entry's first four bytes.
 constexpr Field cellFields[] = {
     {"UARFCN", bitsAt(0, 0, 14), integer("%d")},
     {"Cell ID", bitsAt(1, 6, 7), integer("%d")},
@@ -29,7 +30,7 @@ constexpr EnumText statusRows[] = {{0, "ASET"}, {1, "MSET"}, {2, "DSET"}};
 constexpr EnumTexts statuses(statusRows, "");
 constexpr Field status{"Status", bitsAt(3, 5, 2), text(statuses)};
 static_assert(status.place.end() <= entryLength);
-/// The last of the four has no text: the label is left out of its row.
+/// The last of the four has no text: its row lacks the label.
 constexpr std::int64_t noSet = 3;
 
 constexpr Field detectionFields[] = {
@@ -64,7 +65,7 @@ void UTRANNeighbhorMeasurements::check(const View& view, const Record& record) c
 void UTRANNeighbhorMeasurements::decode(const View&, const Record& record, FieldVisitor& visitor) const {
     const CountedList entries = cells(record);
     visitor.beginList(rows);
-    for (std::size_t i = 0; i < entries.whole(); ++i) {
+    for (std::size_t i = 0; i < entries.completeCount(); ++i) {
         visitor.beginRow();
         visitor.fields(entries[i], cell);
         if (const std::int64_t set = status.place.read(entries[i]); set != noSet)

@@ -10,6 +10,8 @@ namespace velmora {
 
 namespace {
 
+// 0xD0E2: cell identity (3GPP TS 25.331 10.3.2.2), UARFCN (TS 25.102 5.4.3), a byte of the URA identity (TS
+// 25.331 10.3.2.6); access rights as the modem reports them.
 constexpr Field cellFields[] = {
     {"Cell Access Restrictions", u8At(14), integer("%d")},
     {"Cell ID", i32At(21), integer("%d")},
@@ -18,9 +20,10 @@ constexpr Field cellFields[] = {
     {"URA ID", u8At(15), integer("%d")},
     {"Allowed Access", bitsAt(25, 0, 1), flag("Emergency Calls Only", "All Calls")},
 };
-constexpr Layout servingCell = layout(26, cellFields); // 0xD0E2
+constexpr Layout servingCell = layout(26, cellFields);
 
-constexpr CellField knownFields[] = {
+// As the telephony service reports it.
+constexpr CellField serviceFields[] = {
     {kVoxCellMonitorLAC, CellNumber::Whole, "Local Area Code", integer("%d"),
      "Serving Cell Info: Failed to retrieve LAC\n"},
     {kVoxCellMonitorCellId, CellNumber::Whole, "Cell ID", integer("%d"),
@@ -31,13 +34,13 @@ constexpr CellField knownFields[] = {
      "Serving Cell Info: Failed to retrieve Cell Scrambling Code\n"},
     {kVoxCellMonitorUARFCN, CellNumber::Whole, "Uplink UARFCN", integer("%d"),
      "Serving Cell Info: Failed to retrieve UARFCN\n"},
-    // The service knows one channel number, which stands under both labels: that is meant.
+    // The service reports one channel number, which is shown under both labels, on purpose.
     {kVoxCellMonitorUARFCN, CellNumber::Whole, "Downlink UARFCN", integer("%d"), ""},
 };
 constexpr CellKind cellKinds[] = {
     {kVoxCellMonitorRadioAccessTechnologyUTRAN, kVoxCellMonitorCellTypeServing},
 };
-constexpr CellTable knownCells{cellKinds, CellTable::Shown::Last, knownFields};
+constexpr CellTable serviceCells{cellKinds, CellTable::Shown::Last, serviceFields};
 constexpr View sectionViews[] = {
     {0xD0E2, servingCell},
     cellInformation,
@@ -54,7 +57,7 @@ void UTRANServingCellInfo::trace() const {
 }
 
 const CellTable& UTRANServingCellInfo::cellTable() const {
-    return knownCells;
+    return serviceCells;
 }
 
 void UTRANServingCellInfo::unknownCode(std::uint32_t) const {}

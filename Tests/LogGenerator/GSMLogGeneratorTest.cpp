@@ -131,8 +131,8 @@ TEST_F(GSMLogGeneratorTest, EachMessageReplacesTheWholeDisplay) {
 
 TEST_F(GSMLogGeneratorTest, MessageConcernsTheWholeDisplay) {
     RecordedEffects effects;
-    generator.updateStateTelling(state, Data(*writeBinaryPropertyList(dictionary({{"Band", "900"}}))),
-                                 effects);
+    generator.updateStateReporting(state, Data(*writeBinaryPropertyList(dictionary({{"Band", "900"}}))),
+                                   effects);
     EXPECT_EQ(effects.kind, RecordedEffects::Kind::Display);
     EXPECT_EQ(effects.messages, 1);
     ASSERT_EQ(effects.members.size(), 1U);

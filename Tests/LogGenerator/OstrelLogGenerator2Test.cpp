@@ -127,7 +127,7 @@ TEST_P(FramingTest, ReportingDoesTheSame) {
     log.clear();
     const Data message = hex(GetParam().bytes);
     RecordedEffects effects;
-    generator.updateStateTelling(state, message, effects);
+    generator.updateStateReporting(state, message, effects);
     EXPECT_EQ(codesOf(index->baseband), GetParam().basebandCodes);
     EXPECT_EQ(codesOf(index->extra), GetParam().extraCodes);
     EXPECT_EQ(log.textsAt(LogPriority::Error), GetParam().errors);
@@ -145,7 +145,7 @@ TEST_P(FramingTest, ReportingDoesTheSame) {
 
 TEST_F(TemplateTest, SectionsOfACodeAreReportedWithTheirUpdatedNodes) {
     RecordedEffects effects;
-    generator.updateStateTelling(state, record(0x1234, "00 00"), effects);
+    generator.updateStateReporting(state, record(0x1234, "00 00"), effects);
     EXPECT_EQ(effects.code, 0x1234U);
     ASSERT_EQ(effects.members.size(), 2U);
     EXPECT_EQ(effects.members[0].first, "RRC Info");
@@ -155,15 +155,15 @@ TEST_F(TemplateTest, SectionsOfACodeAreReportedWithTheirUpdatedNodes) {
     EXPECT_EQ(effects.members[1].first, "Rows");
     EXPECT_EQ(effects.members[1].second.asArray(), (*radio)["Rows"].asArray());
 
-    generator.updateStateTelling(state, record(2, "", 0xFF), effects);
+    generator.updateStateReporting(state, record(2, "", 0xFF), effects);
     EXPECT_EQ(effects.code, 0xFF0002U);
     ASSERT_EQ(effects.members.size(), 1U);
     EXPECT_EQ(effects.members[0].first, "SIM Info");
 
-    generator.updateStateTelling(state, record(0x1235, ""), effects); // it has no subscriber
+    generator.updateStateReporting(state, record(0x1235, ""), effects); // it has no subscriber
     EXPECT_EQ(effects.code, 0x1235U);
     EXPECT_THAT(effects.members, IsEmpty());
-    generator.updateStateTelling(state, hex("01 02"), effects);
+    generator.updateStateReporting(state, hex("01 02"), effects);
     EXPECT_EQ(effects.code, std::nullopt);
     EXPECT_THAT(effects.members, IsEmpty());
 }
@@ -182,7 +182,7 @@ TEST_F(TemplateTest, SectionOfADuplicateCodeIsReportedOnceAndOneWithoutANodeIsNo
     OstrelLogGenerator2 other("Probe", odd, clock);
     RecordedEffects effects;
     Dictionary fresh;
-    other.updateStateTelling(fresh, record(0x1234, ""), effects);
+    other.updateStateReporting(fresh, record(0x1234, ""), effects);
     EXPECT_EQ(odd->twice.calls.size(), 2U);
     EXPECT_EQ(odd->nowhere.calls.size(), 1U);
     ASSERT_EQ(effects.members.size(), 1U);

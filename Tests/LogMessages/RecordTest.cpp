@@ -59,8 +59,8 @@ TEST_P(CountedListSizeTest, CountsCompleteEntries) {
     const std::vector<std::uint8_t> bytes(GetParam().size);
     const CountedList list(Record(Bytes(bytes)), 4, 3, GetParam().count); // three bytes each, from 4 on
     EXPECT_EQ(list.count(), GetParam().count);
-    EXPECT_EQ(list.whole(), GetParam().whole);
-    EXPECT_EQ(list.isWhole(), list.whole() == list.count());
+    EXPECT_EQ(list.completeCount(), GetParam().whole);
+    EXPECT_EQ(list.isComplete(), list.completeCount() == list.count());
 }
 
 INSTANTIATE_TEST_SUITE_P(
@@ -83,7 +83,7 @@ TEST(CountedListTest, EntryAtOrBeyondTheCountRaises) {
 TEST(CountedListTest, OverlappingEntriesAreMeasuredByTheirLength) {
     const std::vector<std::uint8_t> bytes(12);
     // Stride 3, six bytes each: entries at 0, 3 and 6; one at 9 would end at 15.
-    EXPECT_EQ(CountedList(Record(Bytes(bytes)), 0, 3, 6, 9).whole(), 3u);
+    EXPECT_EQ(CountedList(Record(Bytes(bytes)), 0, 3, 6, 9).completeCount(), 3u);
 }
 
 TEST(CountedListTest, ExceptionIsAStandardOne) {

@@ -64,7 +64,7 @@ Result<Decoded> decodeMessages(MessageReader& reader, const DecodingRequest& req
         clock.setNow(logged.time);
         observer.willDecode(logged);
         if (effects)
-            (*decoder)->updateStateTelling(state, logged.message, *effects);
+            (*decoder)->updateStateReporting(state, logged.message, *effects);
         else
             (*decoder)->updateState(state, logged.message);
         ++decoded.messages;

@@ -10,6 +10,7 @@ namespace velmora::C2K {
 
 namespace {
 
+// 0x12B6: pilot PN offsets (3GPP2 C.S0024); energies in units of 1/512, the modem's own.
 constexpr std::size_t minimumLength = 25; // the pilots follow
 constexpr std::size_t countAt = 15;
 constexpr std::size_t pilotLength = 12;

@@ -23,9 +23,9 @@ struct DataRateKeys {
 };
 
 /// Keeps this record's counters in the state. The reading's number is the rate in kbit/s (of 1024 bits) since
-/// the link's previous record; the first record has none. No reading where the record's number has not moved
-/// on. Counters that start again give a negative rate. `sent`: bits so far; `sequence`: counts on, modulo
-/// 2^32.
+/// the link's previous record; the first record has none. No reading where the record's number has not
+/// increased. Counters that restart result in a negative rate. `sent`: bits so far; `sequence`: increases,
+/// modulo 2^32.
 [[nodiscard]] std::optional<Reading> updateDataRate(const DataRateKeys& keys, std::uint32_t sequence,
                                                     std::uint64_t sent, Dictionary& state);
 

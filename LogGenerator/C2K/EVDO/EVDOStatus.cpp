@@ -11,6 +11,8 @@ namespace velmora::C2K {
 
 namespace {
 
+// 0x1183: band class and channel (3GPP2 C.S0057), PN offset in units of 64 chips, UATI and color code
+// (C.S0024); session and device states have the modem's own numbers, levels are as it reports them.
 constexpr std::size_t exactLength = 50;
 
 constexpr EnumText deviceStateRows[] = {
@@ -30,7 +32,7 @@ constexpr Place deviceState = u8At(36);
 
 constexpr ValueField fields[] = {
     {"kChannel", bitsAt(13, 0, 11), integer("%d")},
-    {"k1xEVDODeviceState", deviceState, text(deviceStates)}, // second, before its place in the record
+    {"k1xEVDODeviceState", deviceState, text(deviceStates)}, // published second, earlier than its offset
     {"kBandClass", bitsAt(14, 3, 5), text(bandClasses)},
     {"kRxAGC0", i8At(15), integer("%+d dBm")},
     {"kRxAGC1", i8At(16), integer("%+d dBm"), Validity::WhileConnected},

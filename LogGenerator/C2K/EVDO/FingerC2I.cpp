@@ -10,6 +10,7 @@ namespace velmora::C2K {
 
 namespace {
 
+// 0x108A: pilot PN offsets (3GPP2 C.S0024); C/I in units of 1/512, the modem's own.
 constexpr std::size_t minimumLength = 23; // the fingers follow
 constexpr std::size_t countAt = 22;
 constexpr std::size_t fingerLength = 14;

@@ -12,6 +12,7 @@ namespace velmora::C2K {
 
 namespace {
 
+// 0x1192: packet counters as the modem reports them; the packet sizes are those of 3GPP2 C.S0024.
 constexpr std::size_t minimumLength = 241;
 constexpr std::size_t sequenceAt = 13;
 constexpr std::size_t countersAt = 17;

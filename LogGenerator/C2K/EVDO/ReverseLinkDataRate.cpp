@@ -12,10 +12,11 @@ namespace velmora::C2K {
 
 namespace {
 
+// 0x127E: packet counters as the modem reports them; the packet sizes are those of 3GPP2 C.S0024.
 constexpr std::size_t minimumLength = 1750;
 constexpr std::size_t sequenceAt = 14;
 
-/// Where the counters of a packet size begin: two groups of four in each of three blocks.
+/// The offsets of a packet size's counters: two groups of four in each of three blocks.
 constexpr std::size_t groupsAt[] = {18, 306};
 constexpr std::size_t countersInGroup = 4;
 constexpr std::size_t sizeStride = 24;
@@ -38,7 +39,7 @@ constexpr DataRateKeys keys = {
     .sent2 = "RLDataSent2",
 };
 
-/// The sum of the counters that stand from there on.
+/// The sum of a group's counters.
 std::uint64_t sum(const Record& counters) {
     std::uint64_t count = 0;
     for (std::size_t i = 0; i < countersInGroup; ++i)

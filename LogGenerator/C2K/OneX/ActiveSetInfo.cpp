@@ -11,8 +11,8 @@ namespace velmora::C2K {
 
 namespace {
 
-/// A pilot's PN offset lies so far past the cursor; the cursor begins at the sub-packet's own
-/// start, not after its header.
+/// A pilot's PN offset (units of 64 chips, 3GPP2 C.S0002) lies so far past the cursor; the cursor begins at
+/// the sub-packet's own start, not after its header. Energies are on the modem's own scale, see energyRatio.
 constexpr std::size_t pnOffsetAt = 12;
 constexpr std::size_t firstEnergyAt = 24;
 

@@ -13,13 +13,13 @@ namespace velmora::C2K {
 /// The active-set sub-packet of the 1x status: the pilots with their energies in dB, relative to the total.
 class ActiveSetInfo {
 public:
-    /// What stands before the pilots.
+    /// What precedes the pilots.
     static constexpr std::size_t headerLength = 12;
 
     /// `subPacket`: the record from the sub-packet's start on. Precondition: it has the header.
     explicit ActiveSetInfo(const Record& subPacket);
 
-    /// The length that its pilots need; `pilots` may only be asked for where the record has it.
+    /// The length that its pilots need; precondition of `visitPilots`: the record has it.
     [[nodiscard]] std::size_t neededLength() const;
 
     /// Names the pilot list. Without pilots it is an empty list; there is no "(none)".

@@ -20,6 +20,7 @@ constexpr std::uint8_t radioFrequency = 2;
 constexpr std::uint8_t activeSet = 3;
 constexpr std::uint8_t fingerInformation = 4; // must be there, and is not read
 
+// 0x119C, sub-packet 1: as the modem reports it.
 constexpr EnumText deviceStateRows[] = {
     {0, "Inactive [0]"},
     {1, "Deep sleep in start state [1]"},
@@ -41,6 +42,8 @@ constexpr ValueField systemStateFields[] = {
     {"k1xDeviceState", u8At(4), text(deviceStates)},
 };
 
+// 0x119C, sub-packet 2: band class (3GPP2 C.S0057), CDMA channel number (C.S0057); levels on the modem's own
+// scales, 0.334 dB from -63.248 dBm and 0.1 dBm.
 constexpr TextFormat receiveLevel = real("%+.2f dBm", 0.334, -63.248);
 
 constexpr ValueField radioFields[] = {
@@ -85,8 +88,8 @@ std::optional<Reading> OneXStatus::accept(const Record& record, Dictionary& stat
     const FoundSubPacket active = subPackets.find(activeSet);
     const FoundSubPacket fingers = subPackets.find(fingerInformation);
     for (const FoundSubPacket& each : {system, radio, active, fingers})
-        if (each.outcome == FoundSubPacket::Outcome::Outside) {
-            static_cast<void>(subPackets.reaches(each, SubPackets::headerLength, logCode()));
+        if (each.outcome == FoundSubPacket::Outcome::PastEnd) {
+            static_cast<void>(subPackets.contains(each, SubPackets::headerLength, logCode()));
             return std::nullopt;
         }
     if (!system.found() || !radio.found() || !active.found() || !fingers.found()) {
@@ -95,15 +98,15 @@ std::optional<Reading> OneXStatus::accept(const Record& record, Dictionary& stat
         return std::nullopt;
     }
 
-    // All that is needed is looked for first, so that a record is shown whole or not at all.
-    if (!subPackets.reaches(system, endOf(systemStateFields, true), logCode()))
+    // All that is needed is checked first, so that a record is shown completely or not at all.
+    if (!subPackets.contains(system, endOf(systemStateFields, true), logCode()))
         return std::nullopt;
     const bool traffic = isTraffic(subPackets.from(system));
-    if (!subPackets.reaches(radio, endOf(radioFields, traffic), logCode()) ||
-        !subPackets.reaches(active, ActiveSetInfo::headerLength, logCode()))
+    if (!subPackets.contains(radio, endOf(radioFields, traffic), logCode()) ||
+        !subPackets.contains(active, ActiveSetInfo::headerLength, logCode()))
         return std::nullopt;
     const ActiveSetInfo activeSetInfo(subPackets.from(active));
-    if (!subPackets.reaches(active, activeSetInfo.neededLength(), logCode()))
+    if (!subPackets.contains(active, activeSetInfo.neededLength(), logCode()))
         return std::nullopt;
 
     Reading reading{record, std::nullopt, status};

@@ -22,7 +22,7 @@ FoundSubPacket SubPackets::find(std::uint8_t id) const {
     std::size_t start = firstAt;
     for (int index = 0; index < count; ++index) {
         if (!_record.has(start, headerLength))
-            return {Outcome::Outside, index, start};
+            return {Outcome::PastEnd, index, start};
         const std::uint16_t size = _record.u16(start + 2);
         const std::size_t end = start + size;
         if (end >= endTolerance + _record.size()) {
@@ -36,7 +36,7 @@ FoundSubPacket SubPackets::find(std::uint8_t id) const {
     return {};
 }
 
-bool SubPackets::reaches(const FoundSubPacket& subPacket, std::size_t length, std::uint16_t logCode) const {
+bool SubPackets::contains(const FoundSubPacket& subPacket, std::size_t length, std::uint16_t logCode) const {
     if (_record.has(subPacket.offset, length))
         return true;
     logFormat(LogPriority::Error,

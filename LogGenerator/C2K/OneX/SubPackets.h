@@ -14,8 +14,8 @@ namespace velmora::C2K {
 struct FoundSubPacket {
     enum class Outcome : std::uint8_t {
         Found,
-        Missing, ///< there is none, or an error in size came first (which has been reported)
-        Outside, ///< the search came to a header that the record does not hold
+        Missing, ///< there is none, or there was an error in size before it (which has been reported)
+        PastEnd, ///< the search reached a header that is not inside the record
     };
 
     Outcome outcome = Outcome::Missing;
@@ -36,13 +36,13 @@ public:
 
     /// The first sub-packet of that id. One that ends 17 bytes or more past the record's end is an error in
     /// size: an error line, whatever its id, and the search is over. (One that ends less far past it is
-    /// accepted, as intended; `reaches` checks what it needs.)
+    /// accepted, as intended; `contains` checks what it needs.)
     [[nodiscard]] FoundSubPacket find(std::uint8_t id) const;
 
     /// Whether the record holds the first `length` bytes from the sub-packet's start on; an error line where
-    /// it does not. Every search that ended outside the record fails here.
-    [[nodiscard]] bool reaches(const FoundSubPacket& subPacket, std::size_t length,
-                               std::uint16_t logCode) const;
+    /// it does not. False for every search that ended past the end of the record.
+    [[nodiscard]] bool contains(const FoundSubPacket& subPacket, std::size_t length,
+                                std::uint16_t logCode) const;
 
     /// The record from the sub-packet's start on.
     [[nodiscard]] Record from(const FoundSubPacket& subPacket) const {

@@ -10,6 +10,8 @@ namespace velmora::C2K {
 
 namespace {
 
+// 0x134F: roaming indicator (3GPP2 C.R1001); SID, NID, base station identity and protocol revision (C.S0005).
+// The system types are as the modem reports them.
 constexpr std::size_t minimumLength = 171;
 constexpr std::size_t versionAt = 13;
 constexpr int leastVersion = 2;
@@ -37,7 +39,7 @@ constexpr ValueField roaming[] = {
 constexpr std::size_t systemTypeAt = 46;
 constexpr std::uint32_t cdmaSystem = 2;
 constexpr ValueField identities[] = {
-    // Those of a system of another type mean something else.
+    // In a system of another type these bytes mean something else.
     {"kSystemId", u16At(50), integer("%d")},
     {"kNetworkId", u16At(52), integer("%d")},
 };
@@ -53,7 +55,7 @@ constexpr ValueField revision[] = {
 static_assert(endOf(roaming, true) <= minimumLength && endOf(identities, true) <= minimumLength &&
               endOf(zone, true) <= minimumLength && endOf(revision, true) <= minimumLength);
 
-/// What stands for the identities of a system of another type.
+/// Shown in place of the identities of a system of another type.
 constexpr EnumTexts unknownTypes("(unknown system type ", ")");
 constexpr Field unknownSystem{"kSystemId", u32At(systemTypeAt), text(unknownTypes)};
 constexpr Field unknownNetwork{"kNetworkId", u32At(systemTypeAt), text(unknownTypes)};

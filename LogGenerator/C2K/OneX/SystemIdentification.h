@@ -7,7 +7,7 @@
 
 namespace velmora::C2K {
 
-/// The serving system: its identities, and how it stands to the home system.
+/// The serving system: its identities, and whether the phone is roaming in it.
 class SystemIdentification final : public LogCodeParser {
 public:
     [[nodiscard]] std::uint16_t logCode() const override { return 0x134F; }

@@ -11,6 +11,7 @@ namespace velmora::C2K {
 
 namespace {
 
+// 0x119D: whether the frame was erased, as the modem reports it.
 constexpr std::uint8_t trafficDemodulation = 11;
 constexpr std::size_t erasureAt = 24; // in the sub-packet
 
@@ -30,7 +31,7 @@ std::optional<Reading> TrafficFER::accept(const Record& record, Dictionary& stat
         logLine(LogPriority::Warning, "Log code 0x119d: missing traffic demod subpacket.");
         return std::nullopt;
     }
-    if (!subPackets.reaches(demodulation, erasureAt + 1, logCode()))
+    if (!subPackets.contains(demodulation, erasureAt + 1, logCode()))
         return std::nullopt;
     const bool erased = subPackets.from(demodulation).u8(erasureAt) != 0;
     return Reading{Record(Bytes()), FrameErrorAverage(state).add(erased)};

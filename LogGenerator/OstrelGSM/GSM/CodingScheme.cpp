@@ -12,7 +12,7 @@ std::span<const View> CodingScheme::views() const {
 }
 
 void CodingScheme::trace() const {
-    logLine(LogPriority::Warning, "CellChangeCounters"); // the word of that section, shared on purpose
+    logLine(LogPriority::Warning, "CellChangeCounters"); // that section's text, on purpose
 }
 
 void CodingScheme::unknownCode(std::uint32_t) const {}

@@ -9,7 +9,8 @@ namespace velmora {
 
 namespace {
 
-// The blanks inside 13, 19 and 21 are part of the texts.
+// 0x512C: states of the radio-resource layer, as the modem reports them. The blanks inside 13, 19 and 21 are
+// part of the texts.
 constexpr EnumText rrStateRows[] = {
     {0, "RR_INACTIVE"},
     {1, "RR_GOING_ACTIVE"},
@@ -42,25 +43,28 @@ constexpr Field stateFields[] = {
     {"RR Status", u8At(15), integer("%d")},
     {"RR Mode", u8At(16), flag("Data", "Voice")},
 };
-constexpr Layout state = layout(17, stateFields); // 0x512C
+constexpr Layout state = layout(17, stateFields);
 
-// The bytes that "GSM Serving Cell" shows as level, C1 and C2: both readings are meant.
+// 0x5137: RXLEV and RXQUAL are quantities of 3GPP TS 45.008 (8.1, 8.2); the numbers are the modem's, not the
+// steps of 8.1.4 and 8.2.4. "GSM Serving Cell" shows the same bytes as level, C1 and C2, on purpose.
 constexpr Field measurementFields[] = {
     {"Serving Rx Level", u8At(15), integer("%d")},
     {"Rx Quality Full", i32At(16), integer("%d")},
     {"Rx Quality Sub", i32At(20), integer("%d")},
 };
-constexpr Layout measurements = layout(29, measurementFields); // 0x5137
+constexpr Layout measurements = layout(29, measurementFields);
 
+// 0x5072: as the modem reports it.
 constexpr Field dtxFields[] = {
     {"DTX Used", u8At(19), flag("ON", "OFF")},
 };
-constexpr Layout dtx = layout(20, dtxFields); // 0x5072
+constexpr Layout dtx = layout(20, dtxFields);
 
+// 0x51F6: the byte of DRX_TIMER_MAX (3GPP TS 44.060 12.24); shown as seconds, as the modem reports it.
 constexpr Field drxFields[] = {
     {"DRX Used", u8At(16), integer("%d sec")},
 };
-constexpr Layout drx = layout(24, drxFields); // 0x51F6
+constexpr Layout drx = layout(24, drxFields);
 
 constexpr View sectionViews[] = {
     {0x512C, state},

@@ -10,28 +10,30 @@ namespace velmora {
 
 namespace {
 
+// 0x5134: cell identity (3GPP TS 23.003 4.3.1), ARFCN (TS 45.005 2), BSIC (TS 23.003 4.3.2).
 constexpr Field identityFields[] = {
     {"Cell ID", u16At(17), integer("%d")},
     {"ARFCN", u16At(13), integer("%d")},
     {"BSIC", u16At(15), integer("%d")},
 };
-constexpr Layout identity = layout(26, identityFields); // 0x5134
+constexpr Layout identity = layout(26, identityFields);
 
-// The level is shown without sign or offset, and of C1 and C2 only the unsigned low halves; "GSM RR Info"
-// shows the same bytes otherwise. Both readings are meant.
+// 0x5137: C1 and C2 (3GPP TS 45.008 6.4), of which only the unsigned low halves are shown; the level is the
+// modem's number without sign or offset, not RXLEV. "GSM RR Info" shows the same bytes otherwise, on purpose.
 constexpr Field levelFields[] = {
     {"RSSI", u8At(15), integer("%d dBm")},
     {"C1 Value", u16At(16), integer("%d")},
     {"C2 Value", u16At(20), integer("%d")},
 };
-constexpr Layout levels = layout(29, levelFields); // 0x5137
+constexpr Layout levels = layout(29, levelFields);
 
-// Only the low byte of the channel number, on purpose: one above 255 shows modulo 256.
+// 0x5076: ARFCN (3GPP TS 45.005 2), only its low byte, on purpose: one above 255 shows modulo 256.
 constexpr Field dedicatedFields[] = {
     {"MA Dedicated ARFCN", u8At(13), integer("%d")},
 };
-constexpr Layout dedicated = layout(17, dedicatedFields); // 0x5076
+constexpr Layout dedicated = layout(17, dedicatedFields);
 
+// As the telephony service reports it.
 constexpr CellField cellFields[] = {
     {kVoxCellMonitorCellId, CellNumber::Whole, "Cell ID", integer("%d"),
      "GSMServingCell: Failed to retrieve Cell ID\n"},

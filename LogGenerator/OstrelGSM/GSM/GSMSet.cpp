@@ -10,10 +10,11 @@ namespace velmora {
 namespace {
 
 constexpr std::size_t minimumLength = 15; // 0x4005
-// "UMTS Set" reads other entries at the same place: which of the two counts is not zero tells what they are.
+// "UMTS Set" reads other entries at the same offset: the count that is not zero decides what they are.
 constexpr Place count = u8At(14);
 static_assert(count.end() <= minimumLength);
 
+// ARFCN (3GPP TS 45.005 2), BSIC (TS 23.003 4.3.2); level and ranking as the modem reports them.
 constexpr Field cellFields[] = {
     {"ARFCN", u16At(0), integer("%d")},
     {"BSIC", u16At(2), integer("%d")},

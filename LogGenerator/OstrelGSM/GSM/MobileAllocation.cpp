@@ -9,10 +9,11 @@ namespace velmora {
 
 namespace {
 
+// 0x51F8: the hopping sequence number (3GPP TS 45.002 6.2.3), then ARFCNs (TS 45.005 2).
 constexpr Field hoppingFields[] = {
     {"HSN", u8At(13), integer("%d")},
 };
-constexpr Layout hopping = layout(15, hoppingFields); // 0x51F8; the count at 14 and the ARFCNs follow
+constexpr Layout hopping = layout(15, hoppingFields); // the count at 14 and the ARFCNs follow
 constexpr std::size_t arfcnLength = 2;
 constexpr Field arfcn{"", u16At(0), integer("%d")};
 static_assert(arfcn.place.end() <= arfcnLength);
@@ -42,7 +43,7 @@ void MobileAllocation::decode(const View&, const Record& record, FieldVisitor& v
     visitor.fields(record, hopping);
     const CountedList entries = arfcns(record);
     visitor.beginList(arfcnList);
-    for (std::size_t i = 0; i < entries.whole(); ++i)
+    for (std::size_t i = 0; i < entries.completeCount(); ++i)
         visitor.number(arfcn, arfcn.place.read(entries[i]));
     visitor.endList();
 }

@@ -12,6 +12,7 @@ namespace {
 
 constexpr std::uint32_t measuredCode = 0x5137;
 constexpr std::size_t measuredMinimumLength = 29;
+// ARFCN (3GPP TS 45.005 2), C1 (TS 45.008 6.4); the level is the modem's number, not RXLEV.
 constexpr Field measuredFields[] = {
     {"ARFCN", u16At(0), integer("%d")},
     {"RSSI", u8At(2), integer("%d")}, // without a unit
@@ -20,24 +21,25 @@ constexpr Field measuredFields[] = {
 constexpr Layout measured = layout(14, measuredFields);
 constexpr Place measuredARFCN = measuredFields[0].place;
 
-constexpr std::size_t bsicMinimumLength = 15; // 0x51FF
+// 0x51FF: the BSIC (3GPP TS 23.003 4.3.2) of an ARFCN.
+constexpr std::size_t bsicMinimumLength = 15;
 constexpr std::size_t bsicEntryLength = 4;
 constexpr Place bsicARFCN = u16At(0);
 constexpr Field bsic{"BSIC", u8At(2), integer("%d")};
 static_assert(bsicARFCN.end() <= bsicEntryLength && bsic.place.end() <= bsicEntryLength);
 
-// Twice the telephony service's number is the level in dBm.
-constexpr CellField knownFields[] = {
+// As the telephony service reports it: twice its number is the level in dBm.
+constexpr CellField serviceFields[] = {
     {kVoxCellMonitorARFCN, CellNumber::Low16, "ARFCN", integer("%d"),
      "NeighboringCells: Failed to retrieve ARFCN\n"},
     {kVoxCellMonitorRSSI, CellNumber::SignedLow16, "RSSI",
      unless(levelNotMeasured, "", integer("%d dBm", 0, 2)), "NeighboringCells: Failed to retrieve RSSI\n"},
 };
 
-constexpr CellKind knownKinds[] = {
+constexpr CellKind serviceKinds[] = {
     {kVoxCellMonitorRadioAccessTechnologyGSM, kVoxCellMonitorCellTypeNeighbor},
 };
-constexpr CellTable known{knownKinds, CellTable::Shown::Rows, knownFields};
+constexpr CellTable serviceCells{serviceKinds, CellTable::Shown::Rows, serviceFields};
 
 constexpr List rows{};
 
@@ -49,7 +51,7 @@ CountedList bsics(const Record& record) {
     return CountedList(record, bsicMinimumLength, bsicEntryLength, record.u8(14));
 }
 
-/// What `bsics` gave of an earlier record.
+/// What `bsics` returned for an earlier record.
 CountedList bsicEntries(Bytes entries) {
     return CountedList(Record(entries), 0, bsicEntryLength, entries.size() / bsicEntryLength);
 }
@@ -70,7 +72,7 @@ void NeighboringCells::trace() const {
 }
 
 const CellTable& NeighboringCells::cellTable() const {
-    return known;
+    return serviceCells;
 }
 
 void NeighboringCells::check(const View& view, const Record& record) const {
@@ -87,7 +89,7 @@ void NeighboringCells::updateWithData(const Data& data, std::uint32_t logCode) {
     trace();
     check(*view, record);
     if (view->code == measuredCode) {
-        // The BSICs as they are known now go with the cells.
+        // The current BSICs are kept with the cells.
         keep(*view, record, 1, [this] { _bsicsOfCells = arfcnToBsic; });
     } else {
         const Bytes kept = bsics(record).entries().bytes();
@@ -103,10 +105,10 @@ void NeighboringCells::decode(const View& view, const Record& record, FieldVisit
     const CountedList cells = measuredCells(record);
     const CountedList knownBSICs = bsicEntries(_bsicsOfCells);
     visitor.beginList(rows);
-    for (std::size_t i = 0; i < cells.whole(); ++i) {
+    for (std::size_t i = 0; i < cells.completeCount(); ++i) {
         visitor.beginRow();
         visitor.fields(cells[i], measured);
-        // Of an ARFCN that stands there twice, the later one counts.
+        // Of an ARFCN that is listed twice, the later entry counts.
         for (std::size_t j = knownBSICs.count(); j-- > 0;)
             if (bsicARFCN.read(knownBSICs[j]) == measuredARFCN.read(cells[i])) {
                 visitor.number(bsic, bsic.place.read(knownBSICs[j]));

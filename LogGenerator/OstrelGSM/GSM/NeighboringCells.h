@@ -24,10 +24,10 @@ private:
     void trace() const override;
     void check(const View& view, const Record& record) const override;
 
-    /// ARFCNs with their BSICs: the entries of the latest 0x51FF as they stand there. What is shown stays as
-    /// it is; the next 0x5137 shows them.
+    /// ARFCNs with their BSICs: the entries of the latest 0x51FF, unchanged. They are shown with the next
+    /// 0x5137.
     std::vector<std::uint8_t> arfcnToBsic;
-    std::vector<std::uint8_t> _bsicsOfCells; ///< as they were when the 0x5137 arrived that is kept
+    std::vector<std::uint8_t> _bsicsOfCells; ///< those at the arrival of the kept 0x5137
 };
 
 } // namespace velmora

@@ -9,9 +9,10 @@ namespace velmora {
 
 namespace {
 
+// 0x7150: MCC and MNC (3GPP TS 23.003 2.2), one digit a byte and alternating, as the modem reports them.
 constexpr std::size_t minimumLength = 17;
-// Entries lie three bytes apart although six are read from each, so that they overlap. That is how the record
-// is read, and it is kept.
+// Entries lie three bytes apart although six are read from each, so that they overlap. That is on
+// purpose.
 constexpr std::size_t stride = 3;
 constexpr std::size_t entryLength = 6;
 
@@ -44,10 +45,10 @@ void EquivalentPLMNList::check(const View& view, const Record& record) const {
 }
 
 void EquivalentPLMNList::decode(const View&, const Record& record, FieldVisitor& visitor) const {
-    // The list ends with the last entry that lies wholly inside the record.
+    // The list ends with the last complete entry.
     const CountedList entries = networks(record);
     visitor.beginList(rows);
-    for (std::size_t i = 0; i < entries.whole(); ++i) {
+    for (std::size_t i = 0; i < entries.completeCount(); ++i) {
         const Record e = entries[i];
         visitor.beginRow();
         visitor.number(countryCode, threeDigits(e.u8(0), e.u8(2), e.u8(4)));

@@ -10,10 +10,11 @@ namespace velmora {
 
 namespace {
 
+// 0x7131: the main MM state (3GPP TS 24.008 4.1.2.1).
 constexpr Field stateFields[] = {
     {"MM State", u8At(13), text(OstrelGSM::mmStates)},
 };
-constexpr Layout state = layout(16, stateFields); // 0x7131
+constexpr Layout state = layout(16, stateFields);
 
 constexpr View sectionViews[] = {
     {0x7131, state},
@@ -27,7 +28,7 @@ std::span<const View> ProcessCO::views() const {
 }
 
 void ProcessCO::trace() const {
-    logLine(LogPriority::Warning, "ProcessCS"); // the circuit-switched section's word, shared on purpose
+    logLine(LogPriority::Warning, "ProcessCS"); // the circuit-switched section's text, on purpose
 }
 
 } // namespace velmora

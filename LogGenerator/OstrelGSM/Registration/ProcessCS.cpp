@@ -10,6 +10,8 @@ namespace velmora {
 
 namespace {
 
+// 0x7131: MM state (3GPP TS 24.008 4.1.2.1); the sub-states of MM IDLE (4.1.2.1) and the update status
+// (4.1.2.2) are the standard's, their numbers the modem's.
 constexpr EnumText subStateRows[] = {
     {0, "MM_NULL_SUBSTATE"},        {1, "MM_NO_IMSI"},
     {2, "MM_PLMN_SEARCH"},          {3, "MM_LIMITED_SERVICE"},
@@ -32,7 +34,7 @@ constexpr Field stateFields[] = {
     {"MM Sub State", u8At(14), text(subStates)},
     {"LU Reject Cause", u8At(15), text(updateStatuses)},
 };
-constexpr Layout state = layout(16, stateFields); // 0x7131
+constexpr Layout state = layout(16, stateFields);
 
 constexpr View sectionViews[] = {
     {0x7131, state},

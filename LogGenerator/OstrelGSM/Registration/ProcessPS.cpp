@@ -10,6 +10,8 @@ namespace velmora {
 
 namespace {
 
+// 0x7130: GMM states and sub-states (3GPP TS 24.008 4.1.3.1) and GPRS update status (4.1.3.2), with the
+// modem's own numbers.
 constexpr EnumText stateRows[] = {
     {0, "GMM_NULL"},
     {1, "GMM_DEREGISTERED"},
@@ -46,13 +48,13 @@ constexpr EnumText updateStatusRows[] = {
 };
 constexpr EnumTexts updateStatuses(updateStatusRows, "Unknown");
 
-// The first label is the same as the circuit-switched state's, by design.
+// The first label is the same as the circuit-switched state's, on purpose.
 constexpr Field stateFields[] = {
     {"MM State", u8At(13), text(states)},
     {"MM Sub State", u8At(14), text(subStates)},
     {"Attach Reject Cause", u8At(15), text(updateStatuses)},
 };
-constexpr Layout state = layout(16, stateFields); // 0x7130
+constexpr Layout state = layout(16, stateFields);
 
 constexpr View sectionViews[] = {
     {0x7130, state},

@@ -10,11 +10,13 @@ namespace velmora {
 
 namespace {
 
+// 0x7132: as the modem reports it.
 constexpr EnumText selectionModeRows[] = {
     {0, "Automatic"}, {1, "Manual"}, {2, "Limited"}, {3, "LIMITED_ROUTINE_ACQ"}, {4, "LIMITED_MANUAL_ACQ"},
 };
 constexpr EnumTexts selectionModes(selectionModeRows, "Unknown");
 
+// As the modem reports them.
 constexpr EnumText serviceTypeRows[] = {
     {0, "NO_SERVICE"}, {1, "CS_ONLY"}, {2, "PS_ONLY"}, {3, "CS_PS_SERVICE"}, {4, "LIMITED_SERVICE"},
 };
@@ -23,9 +25,10 @@ constexpr EnumTexts serviceTypes(serviceTypeRows, "Unknown");
 constexpr Field selectionFields[] = {
     {"PLMN Sel Mod", u8At(14), text(selectionModes)},
 };
-constexpr Layout selection = layout(16, selectionFields); // 0x7132
+constexpr Layout selection = layout(16, selectionFields);
 
-// The PLMN identity at 15 to 17 comes before these.
+// 0x7135: the location area identification (3GPP TS 24.008 10.5.1.3) at 15 to 19, its PLMN identity first,
+// and the RAC (TS 24.008 10.5.5.15).
 constexpr Field areaFields[] = {
     {"Location Area Code", u16BigEndianAt(18), integer("%d")},
     {"Routing Area Code", u8At(20), integer("%d")},
@@ -53,8 +56,8 @@ void visitIdentity(const Record& record, FieldVisitor& visitor) {
     visitor.fields(record, areas);
 }
 
-// Plain decimal numbers, so that a leading zero of the MNC is lost, under the labels that 0x7135 writes as
-// three characters: whichever came last is shown.
+// As the telephony service reports it: plain decimal numbers, so that a leading zero of the MNC is lost,
+// under the labels that 0x7135 writes as three characters: whichever arrived last is shown.
 constexpr CellField cellFields[] = {
     {kVoxCellMonitorMCC, CellNumber::Whole, "Mobile Country Code", integer("%d"),
      "ServingPLMN: Failed to retrieve MCC\n"},

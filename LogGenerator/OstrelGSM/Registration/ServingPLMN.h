@@ -7,7 +7,7 @@
 
 namespace velmora {
 
-/// "Serving PLMN": the network that the phone is registered with, its areas and the service it gives.
+/// "Serving PLMN": the network that the phone is registered with, its areas and the type of service.
 class ServingPLMN final : public CellSection {
 public:
     [[nodiscard]] std::string_view getSectionName() const override { return "Serving PLMN"; }

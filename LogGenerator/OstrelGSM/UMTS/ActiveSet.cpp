@@ -13,22 +13,24 @@ namespace {
 
 constexpr std::int64_t activeSet = 0;
 
+// Primary scrambling code (3GPP TS 25.213 5.2.2), CPICH RSCP and Ec/No (quantities of TS 25.215), both
+// computed from the modem's own scales.
 constexpr Field scramblingCode{"Scrambling Code", SearcherRecord::scramblingCode, integer("%d")};
-// A level, whose unit is shown so all the same.
+// A level, shown in dB on purpose.
 constexpr Field codePower{"RSCP", computed, integer("%d dB")};
 constexpr Field energyPerChip{"Energy Per Chip", computed, integer("%d dB")};
 
 } // namespace
 
 void ActiveSet::checkCells(const Record& record) const {
-    // The measurements follow the cells: one that lies wholly inside the record has its cell there too.
+    // The measurements follow the cells: a complete one has its cell inside the record too.
     reportMissingEntries(SearcherRecord(record).measurements(), SearcherRecord::code);
 }
 
 void ActiveSet::visitCells(const Record& record, FieldVisitor& visitor) const {
     const SearcherRecord searcher(record);
     const int rssi = (searcher.power() + 512) / 10 - 106; // rounded toward zero
-    for (std::size_t i = 0; i < searcher.measurements().whole(); ++i) {
+    for (std::size_t i = 0; i < searcher.measurements().completeCount(); ++i) {
         const Record cell = searcher.cells()[i];
         if (SearcherRecord::setType.read(cell) != activeSet)
             continue;

@@ -9,10 +9,11 @@ namespace velmora {
 
 namespace {
 
+// 0x4116: transport channels (3GPP TS 25.302); counters as the modem reports them.
 constexpr Field windowFields[] = {
     {"Window Size", u16At(14), integer("%d")},
 };
-constexpr Layout window = layout(16, windowFields); // 0x4116; the count at 13, the channels after it
+constexpr Layout window = layout(16, windowFields); // the count at 13, the channels after it
 
 constexpr Field channelFields[] = {
     {"Transport Channel ID", u8At(0), integer("%d")},

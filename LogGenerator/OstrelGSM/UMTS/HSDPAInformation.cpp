@@ -9,6 +9,7 @@ namespace velmora {
 
 namespace {
 
+// 0x4221: HARQ processes of MAC-hs (3GPP TS 25.321); all of it as the modem reports it.
 constexpr EnumText carrierRows[] = {
     {0, "Single Carrier"},
     {1, "MIMO"},
@@ -22,7 +23,7 @@ constexpr Field statusFields[] = {
     {"Sub Frames", bitsAt(14, 0, 10), integer("%u")},
     {"Carrier Info", bitsAt(15, 2, 2), text(carriers)},
 };
-constexpr Layout status = layout(18, statusFields); // 0x4221
+constexpr Layout status = layout(18, statusFields);
 constexpr std::size_t primaryCountAt = 16;
 constexpr std::size_t secondaryCountAt = 17;
 
@@ -35,8 +36,7 @@ constexpr Field processFields[] = {
 constexpr Layout process = layout(9, processFields);
 constexpr List primaryList{"Primary HARQ Process"};
 constexpr List secondaryList{"Secondary HARQ Process"};
-// How far every primary process moves the secondary ones: not the nine bytes of its entry. That is how the
-// record is read, and it is kept.
+// How far every primary process moves the secondary ones: not the nine bytes of its entry, on purpose.
 constexpr std::size_t primarySpan = 162;
 
 CountedList primaryProcesses(const Record& record) {

@@ -8,15 +8,15 @@
 namespace velmora {
 
 /// One of the UMTS searcher's four cell sets: a list that each record of the searcher replaces. A set that
-/// does not override `checkCells` and `visitCells` is never given a cell, whatever set the cell is of: its
-/// list is empty, and that is meant.
+/// does not override `checkCells` and `visitCells` has no cells, whatever set a cell is of: its list is
+/// empty, on purpose.
 class SearcherSet : public Base {
 public:
     [[nodiscard]] std::span<const View> views() const final;
     void decode(const View& view, const Record& record, FieldVisitor& visitor) const final;
 
 protected:
-    /// What the set calls itself in the log.
+    /// The set's name in the log.
     [[nodiscard]] virtual std::string_view traceName() const = 0;
     /// Logs what the record lacks.
     virtual void checkCells(const Record& record) const;

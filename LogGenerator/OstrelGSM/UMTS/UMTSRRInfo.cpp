@@ -12,6 +12,7 @@ namespace velmora {
 
 namespace {
 
+// 0x4125: RRC states (3GPP TS 25.331 7.1), with the modem's own numbers.
 constexpr EnumText rrcStateRows[] = {
     {0, "Disconnected"}, {1, "Connecting"}, {2, "CELL_FACH"},
     {3, "CELL_DCH"},     {4, "CELL_PCH"},   {5, "URA_PCH"},
@@ -21,8 +22,9 @@ constexpr EnumTexts rrcStates(rrcStateRows, "Unknown");
 constexpr Field stateFields[] = {
     {"RRC State", u8At(13), text(rrcStates)},
 };
-constexpr Layout state = layout(14, stateFields); // 0x4125
+constexpr Layout state = layout(14, stateFields);
 
+// The transmit power, on the modem's own scale (see meanPower).
 constexpr std::uint32_t powerCode = 0x4031;
 constexpr std::size_t powerMinimumLength = 16;
 constexpr std::size_t powerEntryLength = 14;
@@ -30,6 +32,7 @@ constexpr Place powerTerm = i16At(4);
 static_assert(powerTerm.end() <= powerEntryLength);
 constexpr Field transmitPower{"Transmit Power", computed, real("%4.2lf dBm")};
 
+// 0x4127: cell identity and URA identity (3GPP TS 25.331 10.3.2.2, 10.3.2.6), UARFCN (TS 25.101 5.4.3).
 constexpr Field cellFields[] = {
     {"Cell ID", i32At(21), integer("%d")},
     {"Downlink Frequency", i32At(17), integer("%d")},
@@ -39,11 +42,13 @@ constexpr Field cellFields[] = {
 constexpr Layout cell = layout(29, cellFields);
 constexpr std::uint32_t cellCode = 0x4127;
 
+// 0x4157: as the modem reports it.
 constexpr Field cipheringFields[] = {
     {"Ciphering", u8At(13), flag("Enabled", "Disabled")},
 };
-constexpr Layout ciphering = layout(19, cipheringFields); // 0x4157
+constexpr Layout ciphering = layout(19, cipheringFields);
 
+// As the telephony service reports it.
 constexpr CellField servingCellFields[] = {
     {kVoxCellMonitorCellId, CellNumber::Whole, "Cell ID", integer("%d"),
      "UMTSRRInfo: Failed to retrieve Cell ID\n"},
@@ -66,7 +71,7 @@ double meanPower(const Record& record) {
     const CountedList entries = powerEntries(record);
     int sum = 0;
     int count = 0;
-    for (std::size_t i = 0; i < entries.whole(); ++i) {
+    for (std::size_t i = 0; i < entries.completeCount(); ++i) {
         const int term = static_cast<int>(powerTerm.read(entries[i]));
         if (term == 0)
             continue; // neither summed nor counted
@@ -74,8 +79,8 @@ double meanPower(const Record& record) {
         sum += (term + 512) / 10 - 70;
         ++count;
     }
-    // The mean of no term is not a number and shows as that, on purpose. Dividing zero by zero would give it
-    // a sign that depends on the processor.
+    // The mean of no term is not a number and shows as that, on purpose. Dividing zero by zero would result
+    // in a sign that depends on the processor.
     return count != 0 ? static_cast<double>(sum) / count : std::numeric_limits<double>::quiet_NaN();
 }
 constexpr View sectionViews[] = {
@@ -107,7 +112,7 @@ void UMTSRRInfo::decode(const View& view, const Record& record, FieldVisitor& vi
         return;
     }
     CellSection::decode(view, record, visitor);
-    // The telephony service's name for the downlink frequency goes when the baseband's arrives.
+    // The baseband's downlink frequency replaces the telephony service's, which has another label.
     if (view.code == cellCode)
         visitor.removed("UARFCN");
 }

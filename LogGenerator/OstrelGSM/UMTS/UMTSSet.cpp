@@ -11,10 +11,12 @@ namespace velmora {
 namespace {
 
 constexpr std::size_t rankedMinimumLength = 15; // 0x4005
-// "GSM Set" reads other entries at the same place: which of the two counts is not zero tells what they are.
+// "GSM Set" reads other entries at the same offset: the count that is not zero decides what they are.
 constexpr Place rankedCount = u8At(13);
 static_assert(rankedCount.end() <= rankedMinimumLength);
 
+// UARFCN (3GPP TS 25.101 5.4.3), primary scrambling code (TS 25.213 5.2.2); CPICH RSCP and Ec/No are
+// quantities of TS 25.215 on the modem's own scales, not the steps of TS 25.133 9.1.1.3 and 9.1.2.3.
 constexpr Field rankedFields[] = {
     {"Scrambling Code", u16At(2), integer("%d")},
     {"RSCP", i8At(4), integer("%d dB", -21)},
@@ -31,7 +33,8 @@ CountedList rankedCells(const Record& record) {
                        static_cast<std::size_t>(rankedCount.read(record)));
 }
 
-constexpr CellField knownFields[] = {
+// As the telephony service reports it.
+constexpr CellField serviceFields[] = {
     {kVoxCellMonitorUARFCN, CellNumber::Low16, "UARFCN", integer("%d"),
      "UMTSSet: Failed to retrieve UARFCN\n"},
     {kVoxCellMonitorSCN, CellNumber::Low16, "Scrambling Code", integer("%d"),
@@ -41,10 +44,10 @@ constexpr CellField knownFields[] = {
     {kVoxCellMonitorECN0, CellNumber::SignedLow16, "Energy Per Chip",
      unless(levelNotMeasured, "", integer("%d dB")), "UMTSSet: Failed to retrieve Energy Per Chip\n"},
 };
-constexpr CellKind knownKinds[] = {
+constexpr CellKind serviceKinds[] = {
     {kVoxCellMonitorRadioAccessTechnologyUMTS, kVoxCellMonitorCellTypeNeighbor},
 };
-constexpr CellTable known{knownKinds, CellTable::Shown::Rows, knownFields};
+constexpr CellTable serviceCells{serviceKinds, CellTable::Shown::Rows, serviceFields};
 constexpr View sectionViews[] = {
     {0x4005, rankedMinimumLength},
     cellInformation,
@@ -61,7 +64,7 @@ void UMTSSet::trace() const {
 }
 
 const CellTable& UMTSSet::cellTable() const {
-    return known;
+    return serviceCells;
 }
 
 void UMTSSet::check(const View& view, const Record& record) const {

@@ -10,7 +10,7 @@
 namespace velmora {
 
 /// "UMTS Set": the UMTS cells that are ranked for reselection, or the neighbours that the telephony service
-/// knows, whichever were reported last; one row each.
+/// reports, whichever arrived last; one row each.
 class UMTSSet final : public CellSection {
 public:
     [[nodiscard]] std::string_view getSectionName() const override { return "UMTS Set"; }

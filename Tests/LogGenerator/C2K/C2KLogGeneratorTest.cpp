@@ -188,7 +188,7 @@ TEST_F(C2KLogGeneratorTest, PublishedValuesAreReported) {
     build();
     const CapturedLog log;
     RecordedEffects effects;
-    generator->updateStateTelling(state, noFingers(), effects);
+    generator->updateStateReporting(state, noFingers(), effects);
     EXPECT_EQ(effects.kind, RecordedEffects::Kind::Values);
     EXPECT_EQ(effects.code, 0x108AU);
     EXPECT_THAT(effects.members, ElementsAre(std::pair<std::string, Value>("kFingerC2I", "(none)")));
@@ -201,7 +201,7 @@ TEST_F(C2KLogGeneratorTest, PublishedValuesAreReported) {
     bytes[46] = 2;  // system type
     bytes[50] = 7;  // SID
     bytes[131] = 9; // packet zone
-    generator->updateStateTelling(state, Data(std::move(bytes)), effects);
+    generator->updateStateReporting(state, Data(std::move(bytes)), effects);
     EXPECT_EQ(effects.code, 0x134FU);
     std::vector<std::string> values;
     for (const auto& [key, value] : effects.members)
@@ -221,7 +221,7 @@ TEST_F(C2KLogGeneratorTest, PublishedValuesAreReported) {
     };
     int told = 2;
     for (const Dropped& row : dropped) {
-        generator->updateStateTelling(state, row.message, effects);
+        generator->updateStateReporting(state, row.message, effects);
         EXPECT_EQ(effects.messages, ++told);
         EXPECT_EQ(effects.code, row.code);
         EXPECT_THAT(effects.members, IsEmpty());

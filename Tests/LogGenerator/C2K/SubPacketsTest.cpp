@@ -66,10 +66,10 @@ INSTANTIATE_TEST_SUITE_P(
         Case{"TooLargeBehindTheWanted", 2, "07 00 04 00 02 00 FF 00", Outcome::Found, 0, 17, quiet},
         Case{"SizeOfZeroStaysWhereItIs", 255, "01 00 00 00 07 00 04 00", Outcome::Missing, 0, 0, quiet},
         Case{"SizeWithinTheHeader", 2, "01 07 01 00 00 00", Outcome::Found, 1, 18, quiet},
-        Case{"CountWithoutAny", 1, "", Outcome::Outside, 0, 17, quiet},
-        Case{"HeaderCutShort", 1, "07 00 04", Outcome::Outside, 0, 17, quiet},
-        Case{"NextBehindTheRecord", 2, "01 00 0A 00", Outcome::Outside, 1, 27, quiet},
-        Case{"NextHeaderCutShort", 2, "01 00 04 00 07 00 04", Outcome::Outside, 1, 21, quiet}),
+        Case{"CountWithoutAny", 1, "", Outcome::PastEnd, 0, 17, quiet},
+        Case{"HeaderCutShort", 1, "07 00 04", Outcome::PastEnd, 0, 17, quiet},
+        Case{"NextBehindTheRecord", 2, "01 00 0A 00", Outcome::PastEnd, 1, 27, quiet},
+        Case{"NextHeaderCutShort", 2, "01 00 04 00 07 00 04", Outcome::PastEnd, 1, 21, quiet}),
     [](const auto& test) { return std::string(test.param.odd); });
 
 TEST(SubPacketsTest, ReachesUpToTheRecordsEnd) {
@@ -77,9 +77,9 @@ TEST(SubPacketsTest, ReachesUpToTheRecordsEnd) {
     const SubPackets subPackets{Record(data)};
     const FoundSubPacket found = subPackets.find(7);
     const CapturedLog log;
-    EXPECT_TRUE(subPackets.reaches(found, 6, 0x119C));
+    EXPECT_TRUE(subPackets.contains(found, 6, 0x119C));
     EXPECT_EQ(log.lines(), LogLines());
-    EXPECT_FALSE(subPackets.reaches(found, 7, 0x119C));
+    EXPECT_FALSE(subPackets.contains(found, 7, 0x119C));
     EXPECT_EQ(log.lines(),
               error("Log code 0x119c is 23 bytes long but its subpkt#0 needs at least 24 bytes."));
     EXPECT_EQ(subPackets.from(found).size(), 6u);

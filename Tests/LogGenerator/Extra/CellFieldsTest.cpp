@@ -29,8 +29,8 @@ constexpr std::array longestTable = rows(std::make_index_sequence<32>());
 
 Cell cellWith(std::int32_t mcc, std::int32_t mnc) {
     Cell cell;
-    cell.setNumber(CellKey(kVoxCellMonitorMCC).place, mcc);
-    cell.setNumber(CellKey(kVoxCellMonitorMNC).place, mnc);
+    cell.setNumber(CellKey(kVoxCellMonitorMCC).index, mcc);
+    cell.setNumber(CellKey(kVoxCellMonitorMNC).index, mnc);
     return cell;
 }
 
@@ -54,7 +54,7 @@ TEST(CellFieldsTest, FieldsThatTheCellLacksAreLeftOutAndLogged) {
         {kVoxCellMonitorLAC, CellNumber::Whole, "LAC", integer("%d"), ""},
     };
     Cell cell;
-    cell.setNumber(CellKey(kVoxCellMonitorMNC).place, 0x1FFFF);
+    cell.setNumber(CellKey(kVoxCellMonitorMNC).index, 0x1FFFF);
     const DictionaryRef node = makeDictionary();
     DisplayWriter::SpareRows spare;
     DisplayWriter writer(*node, spare);

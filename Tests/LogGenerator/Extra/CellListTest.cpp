@@ -66,7 +66,7 @@ std::string slowly(const Data& record) {
             continue;
         const auto place = [&](std::string_view key, const auto& known) {
             const std::string* held = (*fields)[key].asString();
-            return std::to_string(held ? placeOf(*held, known) : std::size(known));
+            return std::to_string(held ? indexOf(*held, known) : std::size(known));
         };
         text += "[" + place(kVoxCellMonitorCellRadioAccessTechnology, cellTechnologies) + " " +
                 place(kVoxCellMonitorCellType, cellTypes);
