@@ -1,0 +1,38 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
+#include "LogGenerator/LTE/LTEClassIndex.h"
+#include "Tests/LogGenerator/Technologies/Technologies.h"
+
+namespace velmora {
+
+Technology expectedLTE() {
+    using Index = LTEClassIndex;
+    return {
+        .name = "LTE",
+        .makeIndex = std::make_unique<Index>,
+        .sections =
+            {
+                {"Serving Cell Info",
+                 held<&Index::objLTEServingCellInfo>,
+                 {0xB0C2, 0xB0C1, 0xFF0001},
+                 "LTE Serving Cell Info"},
+                {"Connected mode LTE Intra-frequency Measurement",
+                 held<&Index::objConnectedModeMeasurementMisc>,
+                 {0xB179}},
+                {"Measured Neighbor Cells", held<&Index::objMeasuredNeighborCells>, {0xB179}},
+                {"Detected Cells", held<&Index::objDetectedCells>, {0xB179}},
+                {"Serving Cell Measurements", held<&Index::objServingCellMeasurement>, {0xB17F}},
+                {"Neighbor Measurements", held<&Index::objNeighborMeasurementMisc>, {0xB180}},
+                {"Neighbor Cells List", held<&Index::objNeighborCellsList>, {0xB180}},
+                {"Reselection Candidates", held<&Index::objReselectionCandidatesMisc>, {0xB186}},
+                {"Reselection Candidates List", held<&Index::objReselectionCandidatesList>, {0xB186}},
+                simInfo(held<&Index::objSimInfo>),
+                contextList(held<&Index::objPDPContextList>),
+            },
+        .noSection = "LTE Serving Cell Info",
+        .consoleAtEnd = "Deallocing LTEClassIndex\nDeallocing ClassIndex\n",
+    };
+}
+
+} // namespace velmora
