@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: MIT
 
 #include "LogGenerator/LTE/LTEClassIndex.h"
+#include "Tests/LogGenerator/SectionHarness.h"
 #include "Tests/LogGenerator/Technologies/Technologies.h"
 
 namespace velmora {
@@ -32,6 +33,16 @@ Technology expectedLTE() {
             },
         .noSection = "LTE Serving Cell Info",
         .consoleAtEnd = "Deallocing LTEClassIndex\nDeallocing ClassIndex\n",
+        .lists = {"Measured Neighbor Cells", "Detected Cells", "Neighbor Cells List",
+                  "Reselection Candidates List", "PDP Context Info"},
+        .silent = {},
+        .longestShort = 20,
+        .shortLines = {},
+        .full = recordWith(0, 300, {{19, 1}, {27, 1}, {28, 1}}),
+        .cells = cellInfo({cell("LTE", "Serving")}),
+        .fullLines = {{0xB0C1, 2}, // the antennas are reported as an unknown message, too
+                      {0xB180, testing::AnyOf(1u, 8u)}, // the list logs what it holds
+                      {0xFF0001, 6}},                   // what the cell lacks
     };
 }
 

@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: MIT
 
 #include "LogGenerator/OstrelGSM/Ostrel_GSMClassIndex.h"
+#include "Tests/LogGenerator/SectionHarness.h"
 #include "Tests/LogGenerator/Technologies/Technologies.h"
 
 namespace velmora {
@@ -57,6 +58,16 @@ Technology expectedOstrelGSM() {
             },
         .noSection = "HSDPAInformation",
         .consoleAtEnd = "Deallocing Ostrel_GSMClassIndex\nDeallocing ClassIndex\n",
+        .lists = {"Equivalent PLMN List", "Neighboring Cells", "Active Set", "Detected Set", "Monitored Set",
+                  "Virtual Active Set", "GSM Set", "UMTS Set", "PDP Context Info"},
+        .silent = {"Coding Scheme", "UMTS RR Measurement", "Cell Change Counters", "Non-Ranked GSM Set",
+                   "Non-Ranked UMTS Set", "HSDPA Info"},
+        .longestShort = 13,
+        .shortLines = {},
+        .full = recordWith(0, 300, {{13, 1}, {14, 1}, {15, 1}, {16, 1}, {17, 1}, {28, 1}}),
+        .cells = cellInfo({cell("GSM", "Serving", {{"ARFCN", 1}}), cell("UMTS", "Serving"),
+                           cell("GSM", "Neighbor"), cell("UMTS", "Neighbor")}),
+        .fullLines = {{0xFF0001, testing::Gt(1u)}}, // what the cells lack
     };
 }
 

@@ -4,13 +4,16 @@
 #pragma once
 
 #include "LogGenerator/ClassIndex.h"
+#include "Platform/Bytes.h"
 #include "Tests/Support/CapturedLog.h"
 
+#include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
 #include <cstdint>
 #include <functional>
 #include <iosfwd>
+#include <map>
 #include <memory>
 #include <set>
 #include <string>
@@ -51,12 +54,23 @@ struct ExpectedSection {
 [[nodiscard]] ExpectedSection simInfo(const Base* (*field)(const ClassIndex&));
 [[nodiscard]] ExpectedSection contextList(const Base* (*field)(const ClassIndex&));
 
+/// How many log lines a record of a code gives where its trace is not the only one.
+using LineCounts = std::map<std::uint32_t, testing::Matcher<std::size_t>>;
+
 struct Technology {
     std::string name; ///< of the tests
     std::function<std::unique_ptr<ClassIndex>()> makeIndex;
     std::vector<ExpectedSection> sections; ///< in the order of their creation
     const char* noSection;                 ///< resembles a section's name and is none
     const char* consoleAtEnd;              ///< what an index prints when it is destroyed
+    std::set<std::string> lists;           ///< the sections whose node is an array
+    std::set<std::string> silent;          ///< those that log nothing for a code that they do not read
+
+    std::size_t longestShort; ///< of the record lengths that are below every minimum
+    LineCounts shortLines;    ///< of records that are too short
+    Data full;                ///< a record that holds all that any of the sections reads
+    Data cells;               ///< a cell information array that each section finds a cell in
+    LineCounts fullLines;     ///< of these two
 
     /// The sections that read the code, in the order of their creation.
     [[nodiscard]] std::vector<ExpectedSection> subscribers(std::uint32_t code) const;

@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: MIT
 
 #include "LogGenerator/UTRAN/UTRANClassIndex.h"
+#include "Tests/LogGenerator/SectionHarness.h"
 #include "Tests/LogGenerator/Technologies/Technologies.h"
 
 namespace velmora {
@@ -28,6 +29,17 @@ Technology expectedUTRAN() {
             },
         .noSection = "RRC_State",
         .consoleAtEnd = "Deallocing ClassIndex\n",
+        .lists = {"Neighbor Cell List", "GSM Neighbor Cell List", "TRCH BLER", "CCTRCH SIR",
+                  "PDP Context Info"},
+        .silent = {"RRC Info", "Serving Cell Info", "Neighbor Cell List", "GSM Neighbor Cell List",
+                   "TRCH BLER", "CCTRCH SIR"},
+        .longestShort = 14,
+        .shortLines = {{0xD0E0, 3},    // the length and the state, both as warnings
+                       {0xFF0001, 2}}, // the cells cannot be read
+        .full = recordWith(0, 3000, {{13, 1}, {14, 0xFF}, {15, 0xFF}, {16, 0xFF}}),
+        .cells = cellInfo({cell("UTRAN", "Serving")}),
+        .fullLines = {{0xD0E0, 2},    // the state
+                      {0xFF0001, 6}}, // what the cell lacks
     };
 }
 
