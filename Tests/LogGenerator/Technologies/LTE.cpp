@@ -11,6 +11,7 @@ Technology expectedLTE() {
     using Index = LTEClassIndex;
     return {
         .name = "LTE",
+        .templateName = "LTE",
         .makeIndex = std::make_unique<Index>,
         .sections =
             {
@@ -36,6 +37,7 @@ Technology expectedLTE() {
         .lists = {"Measured Neighbor Cells", "Detected Cells", "Neighbor Cells List",
                   "Reselection Candidates List", "PDP Context Info"},
         .silent = {},
+        .groups = {"Serving Cell", "Idle Mode Neighbors", "Reselection", "Connected Mode", "Packet Data"},
         .longestShort = 20,
         .shortLines = {},
         .full = recordWith(0, 300, {{19, 1}, {27, 1}, {28, 1}}),

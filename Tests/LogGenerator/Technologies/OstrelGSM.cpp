@@ -11,6 +11,7 @@ Technology expectedOstrelGSM() {
     using Index = Ostrel_GSMClassIndex;
     return {
         .name = "OstrelGSM",
+        .templateName = "Ostrel_GSM",
         .makeIndex = std::make_unique<Index>,
         .sections =
             {
@@ -62,6 +63,7 @@ Technology expectedOstrelGSM() {
                   "Virtual Active Set", "GSM Set", "UMTS Set", "PDP Context Info"},
         .silent = {"Coding Scheme", "UMTS RR Measurement", "Cell Change Counters", "Non-Ranked GSM Set",
                    "Non-Ranked UMTS Set", "HSDPA Info"},
+        .groups = {"Registration", "GSM", "UMTS", "Reselection", "Packet Data"},
         .longestShort = 13,
         .shortLines = {},
         .full = recordWith(0, 300, {{13, 1}, {14, 1}, {15, 1}, {16, 1}, {17, 1}, {28, 1}}),

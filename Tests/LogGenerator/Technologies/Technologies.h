@@ -58,13 +58,15 @@ struct ExpectedSection {
 using LineCounts = std::map<std::uint32_t, testing::Matcher<std::size_t>>;
 
 struct Technology {
-    std::string name; ///< of the tests
+    std::string name;         ///< of the tests
+    const char* templateName; ///< of the resource
     std::function<std::unique_ptr<ClassIndex>()> makeIndex;
     std::vector<ExpectedSection> sections; ///< in the order of their creation
     const char* noSection;                 ///< resembles a section's name and is none
     const char* consoleAtEnd;              ///< what an index prints when it is destroyed
     std::set<std::string> lists;           ///< the sections whose node is an array
     std::set<std::string> silent;          ///< those that log nothing for a code that they do not read
+    std::vector<std::string> groups;       ///< what else the template holds, in its order
 
     std::size_t longestShort; ///< of the record lengths that are below every minimum
     LineCounts shortLines;    ///< of records that are too short

@@ -11,6 +11,7 @@ Technology expectedUTRAN() {
     using Index = UTRANClassIndex;
     return {
         .name = "UTRAN",
+        .templateName = "Ostrel_UTRAN",
         .makeIndex = std::make_unique<Index>,
         .sections =
             {
@@ -33,6 +34,7 @@ Technology expectedUTRAN() {
                   "PDP Context Info"},
         .silent = {"RRC Info", "Serving Cell Info", "Neighbor Cell List", "GSM Neighbor Cell List",
                    "TRCH BLER", "CCTRCH SIR"},
+        .groups = {"Serving Cell", "Neighbors", "Channel Quality"},
         .longestShort = 14,
         .shortLines = {{0xD0E0, 3},    // the length and the state, both as warnings
                        {0xFF0001, 2}}, // the cells cannot be read
