@@ -2,6 +2,8 @@
 // SPDX-License-Identifier: MIT
 
 #include "LogGenerator/LTE/LTEClassIndex.h"
+#include "LogGenerator/LTE/LTELogGenerator.h"
+#include "Platform/TelephonyService.h"
 #include "Tests/LogGenerator/SectionHarness.h"
 #include "Tests/LogGenerator/Technologies/Technologies.h"
 
@@ -11,6 +13,7 @@ Technology expectedLTE() {
     using Index = LTEClassIndex;
     return {
         .name = "LTE",
+        .constant = kVoxLogChannelTechnology_Ostrel_LTE,
         .templateName = "LTE",
         .makeIndex = std::make_unique<Index>,
         .sections =
@@ -45,6 +48,17 @@ Technology expectedLTE() {
         .fullLines = {{0xB0C1, 2}, // the antennas are reported as an unknown message, too
                       {0xB180, testing::AnyOf(1u, 8u)}, // the list logs what it holds
                       {0xFF0001, 6}},                   // what the cell lacks
+        .decoder =
+            {
+                .another = anotherLike<LTELogGenerator>,
+                .firstLine = {LogPriority::Error, "Creating LTELogGenerator object"},
+                // The base class, which is at the same address, has one wording for every technology.
+                .destruction = {"LTELogGenerator", "Ostrel_GSMLogGenerator"},
+                .record = recordWith(0xB0C1, 22, {{20, 2}}),
+                .group = "Serving Cell",
+                .section = "Serving Cell Info",
+                .node = "{Num Tx Antennas '2'}",
+            },
     };
 }
 

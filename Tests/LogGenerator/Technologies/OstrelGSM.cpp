@@ -2,8 +2,11 @@
 // SPDX-License-Identifier: MIT
 
 #include "LogGenerator/OstrelGSM/Ostrel_GSMClassIndex.h"
+#include "LogGenerator/OstrelGSM/Ostrel_GSMLogGenerator.h"
+#include "Platform/TelephonyService.h"
 #include "Tests/LogGenerator/SectionHarness.h"
 #include "Tests/LogGenerator/Technologies/Technologies.h"
+#include "Tests/Support/Hex.h"
 
 namespace velmora {
 
@@ -11,6 +14,7 @@ Technology expectedOstrelGSM() {
     using Index = Ostrel_GSMClassIndex;
     return {
         .name = "OstrelGSM",
+        .constant = kVoxLogChannelTechnology_Ostrel_GSM,
         .templateName = "Ostrel_GSM",
         .makeIndex = std::make_unique<Index>,
         .sections =
@@ -70,6 +74,17 @@ Technology expectedOstrelGSM() {
         .cells = cellInfo({cell("GSM", "Serving", {{"ARFCN", 1}}), cell("UMTS", "Serving"),
                            cell("GSM", "Neighbor"), cell("UMTS", "Neighbor")}),
         .fullLines = {{0xFF0001, testing::Gt(1u)}}, // what the cells lack
+        .decoder =
+            {
+                .another = anotherLike<Ostrel_GSMLogGenerator>,
+                .firstLine = {LogPriority::Error, "Creating Ostrel_GSMLogGenerator object"},
+                // The base class, which is at the same address, logs the same once more.
+                .destruction = {"Ostrel_GSMLogGenerator", "Ostrel_GSMLogGenerator"},
+                .record = record(0x4125, "04"),
+                .group = "UMTS",
+                .section = "UMTS RR Info",
+                .node = "{RRC State 'CELL_PCH'}",
+            },
     };
 }
 

@@ -4,6 +4,7 @@
 #pragma once
 
 #include "LogGenerator/ClassIndex.h"
+#include "LogGenerator/LogGenerator.h"
 #include "Platform/Bytes.h"
 #include "Tests/Support/CapturedLog.h"
 
@@ -17,6 +18,7 @@
 #include <memory>
 #include <set>
 #include <string>
+#include <string_view>
 #include <utility>
 #include <vector>
 
@@ -57,8 +59,28 @@ struct ExpectedSection {
 /// How many log lines a record of a code gives where its trace is not the only one.
 using LineCounts = std::map<std::uint32_t, testing::Matcher<std::size_t>>;
 
+/// A decoder of the technology's class; null where the other is of another class.
+template <class Decoder>
+std::unique_ptr<LogGenerator> anotherLike(const LogGenerator& other, const Clock& clock) {
+    if (!dynamic_cast<const Decoder*>(&other))
+        return nullptr;
+    return Decoder::generator(clock);
+}
+
+struct DecoderExpectation {
+    std::unique_ptr<LogGenerator> (*another)(const LogGenerator& other, const Clock& clock);
+    CapturedLog::Line firstLine;          ///< when it is made
+    std::vector<const char*> destruction; ///< the names whose destruction it logs
+
+    Data record; ///< one of a section, and what it shows
+    const char* group;
+    const char* section;
+    const char* node;
+};
+
 struct Technology {
-    std::string name;         ///< of the tests
+    std::string name; ///< of the tests
+    std::string_view constant;
     const char* templateName; ///< of the resource
     std::function<std::unique_ptr<ClassIndex>()> makeIndex;
     std::vector<ExpectedSection> sections; ///< in the order of their creation
@@ -73,6 +95,8 @@ struct Technology {
     Data full;                ///< a record that holds all that any of the sections reads
     Data cells;               ///< a cell information array that each section finds a cell in
     LineCounts fullLines;     ///< of these two
+
+    DecoderExpectation decoder;
 
     /// The sections that read the code, in the order of their creation.
     [[nodiscard]] std::vector<ExpectedSection> subscribers(std::uint32_t code) const;

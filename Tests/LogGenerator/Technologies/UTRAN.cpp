@@ -2,8 +2,11 @@
 // SPDX-License-Identifier: MIT
 
 #include "LogGenerator/UTRAN/UTRANClassIndex.h"
+#include "LogGenerator/UTRAN/UTRANLogGenerator.h"
+#include "Platform/TelephonyService.h"
 #include "Tests/LogGenerator/SectionHarness.h"
 #include "Tests/LogGenerator/Technologies/Technologies.h"
+#include "Tests/Support/Hex.h"
 
 namespace velmora {
 
@@ -11,6 +14,7 @@ Technology expectedUTRAN() {
     using Index = UTRANClassIndex;
     return {
         .name = "UTRAN",
+        .constant = kVoxLogChannelTechnology_Ostrel_UTRAN2,
         .templateName = "Ostrel_UTRAN",
         .makeIndex = std::make_unique<Index>,
         .sections =
@@ -42,6 +46,17 @@ Technology expectedUTRAN() {
         .cells = cellInfo({cell("UTRAN", "Serving")}),
         .fullLines = {{0xD0E0, 2},    // the state
                       {0xFF0001, 6}}, // what the cell lacks
+        .decoder =
+            {
+                .another = anotherLike<UTRANLogGenerator>,
+                .firstLine = {LogPriority::Warning, "Array Count: 1"},
+                // The line of the base class alone.
+                .destruction = {"Ostrel_GSMLogGenerator"},
+                .record = record(0xD0E0, "01 04"),
+                .group = "Serving Cell",
+                .section = "RRC Info",
+                .node = "{State 'Cell PCH'}",
+            },
     };
 }
 
