@@ -7,6 +7,7 @@
 #include "LogGenerator/Extra/SimInfo.h"
 #include "LogGenerator/OstrelGSM/Registration/ProcessCS.h"
 #include "Tests/LogGenerator/ClassIndexTesting.h"
+#include "Tests/Support/CapturedLog.h"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>

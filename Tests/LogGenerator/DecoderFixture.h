@@ -11,12 +11,9 @@
 
 #include <gtest/gtest.h>
 
-#include <cstdint>
-#include <initializer_list>
 #include <memory>
 #include <string>
 #include <string_view>
-#include <vector>
 
 namespace velmora {
 
@@ -33,35 +30,10 @@ protected:
     /// A section's node as `shown` gives it.
     [[nodiscard]] std::string node(std::string_view group, std::string_view section);
 
-    /// Expects a start command that asks for these codes, ascending, of the baseband's stream and for the
-    /// three of the extra one.
-    void expectStartCommand(const std::vector<std::int64_t>& codes) const;
-
-    /// Makes another decoder and lets it go: expects this line first and, at its end, that each of these
-    /// names says it is destructed.
-    template <class Decoder>
-    void expectFirstAndLastLines(const std::string& first, std::initializer_list<const char*> last) {
-        CapturedLog log;
-        std::unique_ptr<Decoder> another = Decoder::generator(clock);
-        ASSERT_FALSE(log.lines().empty());
-        EXPECT_EQ(log.lines().front(), (CapturedLog::Line{LogPriority::Error, first}));
-        const LogLines expected = destructionLines(last, another.get());
-        log.clear();
-        another.reset();
-        EXPECT_EQ(log.lines(), expected);
-    }
-
-    /// "NAME is destructed ADDRESS" for each name.
-    [[nodiscard]] static LogLines destructionLines(std::initializer_list<const char*> names,
-                                                   const void* decoder);
-
     FakeClock clock;
     FakeResources resources;
     std::unique_ptr<LogGenerator> generator;
     Dictionary state;
 };
-
-/// The lines of the sections that announce themselves by these words.
-[[nodiscard]] LogLines traces(std::initializer_list<const char*> words);
 
 } // namespace velmora

@@ -3,8 +3,8 @@
 
 #include "Telephony/Drives/C2K/C2KScenario.h"
 
-#include "Platform/TelephonyService.h"
 #include "Tests/Telephony/Drives/C2KLayouts.h"
+#include "Tests/Telephony/Drives/ExpectedDrives.h"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
@@ -27,36 +27,7 @@ void eachRecord(std::uint32_t code, const std::function<void(Bytes)>& look) {
     eachRecord(twentyMinutes(), code, isWellFormed, look);
 }
 
-TEST(C2KScenarioTest, speaksOstrelCDMA) {
-    EXPECT_EQ(C2KScenario(1).technology(), kVoxLogChannelTechnology_Ostrel_CDMA);
-}
-
-TEST(C2KScenarioTest, theSameSeedGivesTheSameBytes) {
-    expectSame(driveOf<C2KScenario>(1, 20min), twentyMinutes());
-}
-
-TEST(C2KScenarioTest, anotherSeedGivesAnotherDrive) {
-    const auto trait = [](const LogMessage& header) -> std::optional<unsigned> {
-        if (header.logCode() != 0x134F || !isWellFormed(header))
-            return std::nullopt;
-        return u16(header.record, 184);
-    };
-    EXPECT_EQ(differentDrives<C2KScenario>(trait), 5U);
-}
-
-TEST(C2KScenarioTest, everyCodeComesWithinARound) {
-    for (const std::uint64_t seed : severalSeeds) {
-        SCOPED_TRACE(seed);
-        expectEachCode(driveOf<C2KScenario>(seed, 4min), codesOf(layouts), isWellFormed);
-    }
-}
-
-TEST(C2KScenarioTest, aboutTenMessagesComeASecond) {
-    expectRate(twentyMinutes(), 20min, 7, 13);
-}
-
-TEST(C2KScenarioTest, timeAscendsAndHeadersFollowIt) {
-    expectStampsFollow(twentyMinutes());
+TEST(C2KScenarioTest, headersGiveTheirLengthAndOneStream) {
     for (const ScenarioEvent& event : twentyMinutes())
         if (const auto header = LogMessage::parse(event.message.bytes())) {
             EXPECT_EQ(header->length(), header->record.size() - 1);
@@ -190,4 +161,21 @@ TEST(C2KScenarioTest, countersOnlyGrowAndSoDoTheirSequences) {
 }
 
 } // namespace
+
+ExpectedDrive expectedC2KDrive() {
+    const auto trait = [](const LogMessage& header) -> std::optional<unsigned> {
+        if (header.logCode() != 0x134F || !isWellFormed(header))
+            return std::nullopt;
+        return u16(header.record, 184);
+    };
+    return {.name = "c2k",
+            .length = 20min,
+            .round = 4min,
+            .leastRate = 7,
+            .mostRate = 13,
+            .codes = codesOf(layouts),
+            .good = isWellFormed,
+            .trait = trait};
+}
+
 } // namespace velmora

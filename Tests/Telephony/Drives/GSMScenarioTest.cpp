@@ -3,8 +3,7 @@
 
 #include "Telephony/Drives/GSM/GSMScenario.h"
 
-#include "Platform/TelephonyService.h"
-#include "Tests/Telephony/Drives/ScenarioTesting.h"
+#include "Tests/Telephony/Drives/ExpectedDrives.h"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
@@ -64,68 +63,6 @@ const std::set<std::uint32_t> codes = codesOf(requirements);
 /// Calls `look` with every record of that code that is as its table says.
 void eachRecord(std::uint32_t code, const std::function<void(Bytes)>& look) {
     eachRecord(tenMinutes(), code, meets(requirements), look);
-}
-
-TEST(GSMScenarioTest, speaksOstrelGSM) {
-    EXPECT_EQ(GSMScenario(1).technology(), kVoxLogChannelTechnology_Ostrel_GSM);
-}
-
-TEST(GSMScenarioTest, theSameSeedGivesTheSameBytes) {
-    expectSame(driveOf<GSMScenario>(1, 10min), tenMinutes());
-}
-
-TEST(GSMScenarioTest, anotherSeedGivesAnotherDrive) {
-    const auto trait = [](const LogMessage& header) -> std::optional<unsigned> {
-        if (header.logCode() != 0x5134)
-            return std::nullopt;
-        return u16(header.record, 13) << 8 | header.record[15];
-    };
-    EXPECT_EQ(differentDrives<GSMScenario>(trait), 5U);
-}
-
-TEST(GSMScenarioTest, everyCodeComesWithinARound) {
-    for (const std::uint64_t seed : severalSeeds) {
-        SCOPED_TRACE(seed);
-        expectEachCode(driveOf<GSMScenario>(seed, 6min), codes, meets(requirements));
-    }
-}
-
-TEST(GSMScenarioTest, aboutTwentyMessagesComeASecond) {
-    expectRate(tenMinutes(), 10min, 15, 25);
-}
-
-TEST(GSMScenarioTest, recordsMatchTheirTablesExceptUnusualOnes) {
-    const RecordCensus census = censusOf(tenMinutes(), requirements);
-    EXPECT_EQ(codesOf(census.good), codes);
-    // One unusual message every ten seconds, a sixth of them of each kind.
-    EXPECT_GE(countOf(census.belowMinimum), 3U);
-    EXPECT_LE(countOf(census.belowMinimum), 20U);
-    EXPECT_GE(countOf(census.overrun), 3U);
-    EXPECT_LE(countOf(census.overrun), 20U);
-}
-
-TEST(GSMScenarioTest, everyKindOfUnusualMessageOccurs) {
-    const OddMessages odd = unusualMessagesOf(tenMinutes(), meets(requirements), codes);
-    for (const int count : {odd.tooShort, odd.wrongType, odd.prefixed, odd.unknownCode})
-        EXPECT_GE(count, 3);
-}
-
-TEST(GSMScenarioTest, timeAscendsAndStampsFollowIt) {
-    expectStampsFollow(tenMinutes());
-}
-
-TEST(GSMScenarioTest, extraPayloadsAreReadablePropertyListsOfBothForms) {
-    expectExtraLists(driveOf<GSMScenario>(4, 15min), [](unsigned code, const Value& list) {
-        if (code == 0) {
-            for (const auto& [key, value] : *list.asDictionary()) {
-                EXPECT_TRUE(key.starts_with("kSimFile_")) << key;
-                EXPECT_TRUE(value.asString()) << key;
-            }
-        } else {
-            for (const Value& each : *list.asArray())
-                EXPECT_TRUE(each.asDictionary());
-        }
-    });
 }
 
 TEST(GSMScenarioTest, gsmValuesArePlausible) {
@@ -266,4 +203,25 @@ TEST(GSMScenarioTest, theDriveRepeats) {
 }
 
 } // namespace
+
+ExpectedDrive expectedGSMDrive() {
+    const auto trait = [](const LogMessage& header) -> std::optional<unsigned> {
+        if (header.logCode() != 0x5134)
+            return std::nullopt;
+        return u16(header.record, 13) << 8 | header.record[15];
+    };
+    // One unusual message every ten seconds, a sixth of them of each kind.
+    const auto aSixth = testing::AllOf(testing::Ge(3U), testing::Le(20U));
+    return {.name = "gsm",
+            .length = 10min,
+            .round = 6min,
+            .leastRate = 15,
+            .mostRate = 25,
+            .codes = codes,
+            .good = meets(requirements),
+            .trait = trait,
+            .requirements = &requirements,
+            .odd = {.length = 10min, .shortCount = aSixth, .overrunCount = aSixth}};
+}
+
 } // namespace velmora

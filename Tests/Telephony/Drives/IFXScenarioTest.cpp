@@ -4,7 +4,6 @@
 #include "Telephony/Drives/IFX/IFXScenario.h"
 
 #include "LogGenerator/GSM/GSMLogGenerator.h"
-#include "Platform/TelephonyService.h"
 #include "PropertyLists/PropertyList.h"
 #include "Telephony/Service/LogFilter.h"
 #include "Tests/Support/FakeClock.h"
@@ -65,16 +64,11 @@ int numberAt(const Value& display, std::initializer_list<std::string_view> path)
     return number;
 }
 
-TEST(IFXScenarioTest, speaksIFX) {
-    EXPECT_EQ(IFXScenario(1).technology(), kVoxLogChannelTechnology_IFX);
-}
-
-TEST(IFXScenarioTest, theSameSeedGivesTheSameBytes) {
-    const Drive once = driveOf<IFXScenario>(1, 10min);
-    ASSERT_EQ(once.size(), 600U) << "one message a second";
-    for (std::size_t i = 0; i < once.size(); ++i)
-        ASSERT_EQ(once[i].offset, std::chrono::seconds(i));
-    expectSame(driveOf<IFXScenario>(1, 10min), once);
+TEST(IFXScenarioTest, oneMessageComesASecond) {
+    const Drive drive = driveOf<IFXScenario>(1, 10min);
+    ASSERT_EQ(drive.size(), 600U);
+    for (std::size_t i = 0; i < drive.size(); ++i)
+        ASSERT_EQ(drive[i].offset, std::chrono::seconds(i));
 }
 
 TEST(IFXScenarioTest, anotherSeedGivesAnotherDrive) {

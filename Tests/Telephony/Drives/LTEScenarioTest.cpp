@@ -3,8 +3,7 @@
 
 #include "Telephony/Drives/LTE/LTEScenario.h"
 
-#include "Platform/TelephonyService.h"
-#include "Tests/Telephony/Drives/ScenarioTesting.h"
+#include "Tests/Telephony/Drives/ExpectedDrives.h"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
@@ -62,30 +61,6 @@ void eachGood(std::uint32_t code, const std::function<void(Bytes)>& look) {
 const std::map<unsigned, unsigned> uplinks = {{1300, 19300}, {3175, 21175}, {6300, 24300},
                                               {9310, 27310}, {3625, 21625}, {2410, 20410}};
 
-TEST(LTEScenarioTest, speaksOstrelLTE) {
-    EXPECT_EQ(LTEScenario(1).technology(), kVoxLogChannelTechnology_Ostrel_LTE);
-}
-
-TEST(LTEScenarioTest, theSameSeedGivesTheSameBytes) {
-    expectSame(driveOf<LTEScenario>(1, 20min), twentyMinutes());
-}
-
-TEST(LTEScenarioTest, anotherSeedGivesAnotherDrive) {
-    const auto trait = [](const LogMessage& header) -> std::optional<unsigned> {
-        if (header.logCode() != 0xB0C2)
-            return std::nullopt;
-        return u16(header.record, 14);
-    };
-    EXPECT_EQ(differentDrives<LTEScenario>(trait), 5U);
-}
-
-TEST(LTEScenarioTest, everyCodeComesWithinTwoMinutes) {
-    for (const std::uint64_t seed : severalSeeds) {
-        SCOPED_TRACE(seed);
-        expectEachCode(driveOf<LTEScenario>(seed, 2min), codes, isGood);
-    }
-}
-
 TEST(LTEScenarioTest, aRoundBringsEveryBandwidthAndTechnology) {
     for (const std::uint64_t seed : severalSeeds) {
         std::set<unsigned> bandwidths;
@@ -105,34 +80,7 @@ TEST(LTEScenarioTest, aRoundBringsEveryBandwidthAndTechnology) {
     }
 }
 
-TEST(LTEScenarioTest, sixToEightMessagesComeASecond) {
-    expectRate(twentyMinutes(), 20min, 5, 9);
-}
-
-TEST(LTEScenarioTest, recordsMatchTheirTablesExceptUnusualOnes) {
-    const RecordCensus census = censusOf(twentyMinutes(), requirements);
-    EXPECT_EQ(codesOf(census.good), codes);
-    // One unusual message every ten seconds, a sixth of them of each kind, alternating between these codes.
-    EXPECT_EQ(codesOf(census.belowMinimum),
-              (std::set<std::uint32_t>{0xB0C2, 0xB179, 0xB17F, 0xB180, 0xB186}));
-    EXPECT_LE(countOf(census.belowMinimum), 40U);
-    EXPECT_EQ(codesOf(census.overrun), (std::set<std::uint32_t>{0xB179, 0xB180, 0xB186}));
-    for (const auto& [code, records] : census.overrun)
-        EXPECT_GE(records.size(), 2U) << std::hex << code;
-    EXPECT_LE(countOf(census.overrun), 40U);
-}
-
-TEST(LTEScenarioTest, everyKindOfUnusualMessageOccurs) {
-    const OddMessages odd = unusualMessagesOf(twentyMinutes(), isGood, codes);
-    for (const int count : {odd.tooShort, odd.wrongType, odd.prefixed, odd.unknownCode})
-        EXPECT_GE(count, 3);
-}
-
-TEST(LTEScenarioTest, timeAscendsAndStampsFollowIt) {
-    expectStampsFollow(twentyMinutes());
-}
-
-TEST(LTEScenarioTest, extraPayloadsAreReadablePropertyListsOfBothForms) {
+TEST(LTEScenarioTest, theServingCellComesFirst) {
     bool servingFirst = false;
     expectExtraLists(twentyMinutes(), [&](unsigned code, const Value& list) {
         if (code != 1 || list.asArray()->size() < 4)
@@ -219,4 +167,29 @@ TEST(LTEScenarioTest, aThirdOfTheTimeOrMoreIsConnected) {
 }
 
 } // namespace
+
+ExpectedDrive expectedLTEDrive() {
+    const auto trait = [](const LogMessage& header) -> std::optional<unsigned> {
+        if (header.logCode() != 0xB0C2)
+            return std::nullopt;
+        return u16(header.record, 14);
+    };
+    return {.name = "lte",
+            .length = 20min,
+            .round = 2min,
+            .leastRate = 5,
+            .mostRate = 9,
+            .codes = codes,
+            .good = isGood,
+            .trait = trait,
+            .requirements = &requirements,
+            // One unusual message every ten seconds, a sixth of them of each kind, these codes in turn.
+            .odd = {.length = 20min,
+                    .shortCodes = std::set<std::uint32_t>{0xB0C2, 0xB179, 0xB17F, 0xB180, 0xB186},
+                    .shortCount = testing::Le(40U),
+                    .overrunCodes = std::set<std::uint32_t>{0xB179, 0xB180, 0xB186},
+                    .overrunCount = testing::Le(40U),
+                    .overrunsOfEachCode = testing::Ge(2U)}};
+}
+
 } // namespace velmora

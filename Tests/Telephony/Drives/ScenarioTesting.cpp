@@ -3,11 +3,8 @@
 
 #include "Tests/Telephony/Drives/ScenarioTesting.h"
 
-#include "LogMessages/RecordTime.h"
 #include "PropertyLists/PropertyList.h"
-#include "Telephony/Drives/DriveScenario.h"
 
-#include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
 #include <utility>
@@ -74,69 +71,6 @@ RecordCensus censusOf(const Drive& drive, const Requirements& requirements) {
     return census;
 }
 
-std::size_t countOf(const std::map<std::uint32_t, std::vector<Bytes>>& records) {
-    std::size_t count = 0;
-    for (const auto& [code, each] : records)
-        count += each.size();
-    return count;
-}
-
-OddMessages unusualMessagesOf(const Drive& drive, const RecordCheck& good,
-                              const std::set<std::uint32_t>& codes) {
-    OddMessages odd;
-    for (const ScenarioEvent& event : drive) {
-        const auto header = LogMessage::parse(event.message.bytes());
-        if (!header) {
-            EXPECT_EQ(event.message.size(), 5U);
-            EXPECT_EQ(event.message.bytes()[0], 1);
-            ++odd.tooShort;
-        } else if (header->prefixed) {
-            EXPECT_EQ(header->type, 1);
-            EXPECT_TRUE(good(*header)) << "prefixed record of code 0x" << std::hex << header->logCode();
-            ++odd.prefixed;
-        } else if (header->type == 2) {
-            ++odd.wrongType;
-        } else {
-            EXPECT_THAT(header->type, ::testing::AnyOf(1, 0xFF));
-            odd.unknownCode += !codes.contains(header->logCode());
-        }
-    }
-    return odd;
-}
-
-void expectSame(const Drive& again, const Drive& first) {
-    ASSERT_EQ(again.size(), first.size());
-    for (std::size_t i = 0; i < again.size(); ++i) {
-        ASSERT_EQ(again[i].offset, first[i].offset) << "message " << i;
-        ASSERT_EQ(again[i].message, first[i].message) << "message " << i;
-    }
-}
-
-void expectStampsFollow(const Drive& drive) {
-    std::chrono::nanoseconds last{0};
-    for (const ScenarioEvent& event : drive) {
-        EXPECT_GE(event.offset, last);
-        last = event.offset;
-        if (const auto header = LogMessage::parse(event.message.bytes())) {
-            EXPECT_EQ(header->timestamp(), recordTimestamp(DriveScenario::startTime() + event.offset));
-        }
-    }
-}
-
-void expectRate(const Drive& drive, std::chrono::seconds duration, double least, double most) {
-    const double rate = static_cast<double>(drive.size()) / static_cast<double>(duration.count());
-    EXPECT_GE(rate, least) << "messages a second";
-    EXPECT_LE(rate, most) << "messages a second";
-}
-
-void expectEachCode(const Drive& drive, const std::set<std::uint32_t>& codes, const RecordCheck& good) {
-    std::set<std::uint32_t> missing = codes;
-    for (const ScenarioEvent& event : drive)
-        if (const auto header = LogMessage::parse(event.message.bytes()); header && good(*header))
-            missing.erase(header->logCode());
-    EXPECT_THAT(missing, ::testing::IsEmpty()) << "codes without a good record";
-}
-
 void expectExtraLists(const Drive& drive, const std::function<void(unsigned code, const Value& list)>& look) {
     std::map<unsigned, std::set<bool>> binary;
     for (const ScenarioEvent& event : drive) {
@@ -152,15 +86,6 @@ void expectExtraLists(const Drive& drive, const std::function<void(unsigned code
     }
     const std::set<bool> both = {false, true};
     EXPECT_EQ(binary, (std::map<unsigned, std::set<bool>>{{0, both}, {1, both}, {2, both}}));
-}
-
-std::vector<unsigned> traitsOf(const Drive& drive, const Trait& trait) {
-    std::vector<unsigned> traits;
-    for (const ScenarioEvent& event : drive)
-        if (const auto header = LogMessage::parse(event.message.bytes()))
-            if (const auto seen = trait(*header))
-                traits.push_back(*seen);
-    return traits;
 }
 
 } // namespace velmora

@@ -12,7 +12,6 @@
 #include <cstdint>
 #include <functional>
 #include <map>
-#include <optional>
 #include <set>
 #include <vector>
 
@@ -70,43 +69,9 @@ template <class Entry>
         codes.insert(code);
     return codes;
 }
-/// How many records all codes have together.
-[[nodiscard]] std::size_t countOf(const std::map<std::uint32_t, std::vector<Bytes>>& records);
-
-/// The messages of a drive with unusual framing, or of a code without a table.
-struct OddMessages {
-    int tooShort = 0; ///< five bytes
-    int wrongType = 0;
-    int prefixed = 0;
-    int unknownCode = 0;
-};
-/// Expects the prefixed ones to be good records.
-[[nodiscard]] OddMessages unusualMessagesOf(const Drive& drive, const RecordCheck& good,
-                                            const std::set<std::uint32_t>& codes);
-
-/// Expects the same offsets and bytes.
-void expectSame(const Drive& again, const Drive& first);
-/// Expects ascending offsets, and time stamps that follow them.
-void expectStampsFollow(const Drive& drive);
-/// Expects so many messages a second.
-void expectRate(const Drive& drive, std::chrono::seconds duration, double least, double most);
-/// Expects a good record of each code.
-void expectEachCode(const Drive& drive, const std::set<std::uint32_t>& codes, const RecordCheck& good);
 /// Expects the three lists of the extra stream in the binary and the XML form: the SIM's a dictionary, the
 /// others arrays. Calls `look` with each and its code, 0 to 2.
 void expectExtraLists(const Drive& drive, const std::function<void(unsigned code, const Value& list)>& look);
-
-/// What tells one drive from another: of most records nothing.
-using Trait = std::function<std::optional<unsigned>(const LogMessage&)>;
-[[nodiscard]] std::vector<unsigned> traitsOf(const Drive& drive, const Trait& trait);
-/// How many of five seeds' drives differ in that, by their first two minutes.
-template <class Kind>
-[[nodiscard]] std::size_t differentDrives(const Trait& trait) {
-    std::set<std::vector<unsigned>> drives;
-    for (std::uint64_t seed = 1; seed <= 5; ++seed)
-        drives.insert(traitsOf(driveOf<Kind>(seed, std::chrono::minutes(2)), trait));
-    return drives.size();
-}
 
 /// The seeds with which a test tries more than one drive.
 inline constexpr std::uint64_t severalSeeds[] = {1, 2, 3, 99};

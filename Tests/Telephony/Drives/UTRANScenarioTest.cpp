@@ -3,8 +3,7 @@
 
 #include "Telephony/Drives/UTRAN/UTRANScenario.h"
 
-#include "Platform/TelephonyService.h"
-#include "Tests/Telephony/Drives/ScenarioTesting.h"
+#include "Tests/Telephony/Drives/ExpectedDrives.h"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
@@ -49,63 +48,6 @@ const std::set<std::uint32_t> codes = codesOf(requirements);
 /// Calls `look` with every whole record of that code.
 void eachRecord(std::uint32_t code, const std::function<void(Bytes)>& look) {
     eachRecord(tenMinutes(), code, meets(requirements), look);
-}
-
-TEST(UTRANScenarioTest, speaksOstrelUTRAN2) {
-    EXPECT_EQ(UTRANScenario(1).technology(), kVoxLogChannelTechnology_Ostrel_UTRAN2);
-}
-
-TEST(UTRANScenarioTest, theSameSeedGivesTheSameBytes) {
-    expectSame(driveOf<UTRANScenario>(1, 10min), tenMinutes());
-}
-
-TEST(UTRANScenarioTest, anotherSeedGivesAnotherDrive) {
-    const auto trait = [](const LogMessage& header) -> std::optional<unsigned> {
-        if (header.logCode() != 0xD0E2 || header.record.size() < 26)
-            return std::nullopt;
-        return u16(header.record, 19) << 16 | u16(header.record, 21);
-    };
-    EXPECT_EQ(differentDrives<UTRANScenario>(trait), 5U);
-}
-
-TEST(UTRANScenarioTest, everyCodeComesWithinARound) {
-    for (const std::uint64_t seed : severalSeeds) {
-        SCOPED_TRACE(seed);
-        expectEachCode(driveOf<UTRANScenario>(seed, 2min), codes, meets(requirements));
-    }
-}
-
-TEST(UTRANScenarioTest, aboutTenMessagesComeASecond) {
-    expectRate(tenMinutes(), 10min, 7, 16);
-}
-
-TEST(UTRANScenarioTest, recordsMatchTheirTablesExceptUnusualOnes) {
-    const Drive drive = driveOf<UTRANScenario>(1, 30min);
-    const RecordCensus census = censusOf(drive, requirements);
-    EXPECT_EQ(codesOf(census.good), codes);
-    EXPECT_EQ(codesOf(census.belowMinimum), (std::set<std::uint32_t>{0xD0E0, 0xD0E2}));
-    for (const auto& [code, records] : census.belowMinimum)
-        for (const Bytes record : records)
-            EXPECT_EQ(record.size(), requirements.at(code).minimum - 1) << "just one byte short";
-    EXPECT_EQ(codesOf(census.overrun), (std::set<std::uint32_t>{0xD00A, 0xD00C, 0xD00E}));
-    // One unusual message every ten seconds, a third of them of these two kinds.
-    const std::size_t odd = countOf(census.belowMinimum) + countOf(census.overrun);
-    EXPECT_GE(odd, 40U);
-    EXPECT_LE(odd, 90U);
-}
-
-TEST(UTRANScenarioTest, everyKindOfUnusualMessageOccurs) {
-    const OddMessages odd = unusualMessagesOf(tenMinutes(), meets(requirements), codes);
-    for (const int count : {odd.tooShort, odd.wrongType, odd.prefixed, odd.unknownCode})
-        EXPECT_GE(count, 3);
-}
-
-TEST(UTRANScenarioTest, timeAscendsAndStampsFollowIt) {
-    expectStampsFollow(tenMinutes());
-}
-
-TEST(UTRANScenarioTest, extraPayloadsAreReadablePropertyListsOfBothForms) {
-    expectExtraLists(driveOf<UTRANScenario>(4, 15min), [](unsigned, const Value&) {});
 }
 
 TEST(UTRANScenarioTest, valuesArePlausible) {
@@ -221,4 +163,28 @@ TEST(UTRANScenarioTest, anIdlePhoneRegistersWhereTheAreaChanges) {
 }
 
 } // namespace
+
+ExpectedDrive expectedUTRANDrive() {
+    const auto trait = [](const LogMessage& header) -> std::optional<unsigned> {
+        if (header.logCode() != 0xD0E2 || header.record.size() < 26)
+            return std::nullopt;
+        return u16(header.record, 19) << 16 | u16(header.record, 21);
+    };
+    return {.name = "utran",
+            .length = 10min,
+            .round = 2min,
+            .leastRate = 7,
+            .mostRate = 16,
+            .codes = codes,
+            .good = meets(requirements),
+            .trait = trait,
+            .requirements = &requirements,
+            // One unusual message every ten seconds, a third of them of these two kinds.
+            .odd = {.length = 30min,
+                    .shortCodes = std::set<std::uint32_t>{0xD0E0, 0xD0E2},
+                    .missing = 1,
+                    .overrunCodes = std::set<std::uint32_t>{0xD00A, 0xD00C, 0xD00E},
+                    .count = testing::AllOf(testing::Ge(40U), testing::Le(90U))}};
+}
+
 } // namespace velmora
