@@ -35,13 +35,13 @@ public:
         launchAndConnect();
         show(dictionary({{"State", "idle"}, {"Cell", "12"}}));
         app.showSaveView();
-        settle();
+        runUntilIdle();
         countCalls(true);
         saveScreen()->savePressed();
         countCalls(false);
         const bool refused = eventuallyShown("File Error");
         platform.queue.runPending();
-        settle();
+        runUntilIdle();
         // It goes on: the save screen is gone and the next display is shown.
         show(dictionary({{"State", "connected"}, {"Cell", "12"}}));
         std::printf("%s; %s\n", refused ? "refused" : "saved",
@@ -53,7 +53,7 @@ private:
     [[nodiscard]] bool eventuallyShown(const std::string& title) {
         const auto limit = std::chrono::steady_clock::now() + std::chrono::milliseconds(300);
         while (!isShown(title) && std::chrono::steady_clock::now() < limit)
-            settle();
+            runUntilIdle();
         return isShown(title);
     }
 

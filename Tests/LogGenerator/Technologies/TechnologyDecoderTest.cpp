@@ -88,7 +88,7 @@ TEST_P(TechnologyDecoderTest, ARecordReachesItsSectionsInOrder) {
     EXPECT_EQ(update(extraRecord(0, makeDictionary())), traces(0xFF0000));
     EXPECT_EQ(update(cellInfo({})), traces(0xFF0001));
     EXPECT_EQ(update(extraRecord(2, makeArray())), traces(0xFF0002));
-    for (const std::uint16_t unknown : {0x1234, 0xD0E1})
+    for (const std::uint16_t unknown : std::initializer_list<std::uint16_t>{0x1234, 0xD0E1})
         EXPECT_THAT(update(recordWith(unknown, 20)), IsEmpty()) << std::hex << unknown;
 }
 
