@@ -77,7 +77,7 @@ CommandLine parseCommandLine(int count, const char* const* arguments) {
             line.command = CommandLine::Notice{ExitStatus::Done, out.str()};
         else
             line.command = CommandLine::Notice{ExitStatus::Usage, "velmora-log: " + usageError(app, error) +
-                                                                      "\nsee velmora-log --help\n"};
+                                                                      "\nvelmora-log --help tells more\n"};
         return line;
     }
     if (decodeCommand->parsed())

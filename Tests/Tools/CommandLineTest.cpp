@@ -153,7 +153,7 @@ TEST(CommandLineTest, UsageErrorsGiveTheFoundAndTheExpectedValue) {
         const auto* words = std::get_if<CommandLine::Notice>(&line.command);
         ASSERT_NE(words, nullptr) << row.message;
         EXPECT_EQ(words->status, 2);
-        EXPECT_EQ(words->text, std::string("velmora-log: ") + row.message + "\nsee velmora-log --help\n");
+        EXPECT_EQ(words->text, std::string("velmora-log: ") + row.message + "\nvelmora-log --help tells more\n");
     }
 }
 
@@ -186,7 +186,7 @@ TEST_F(CommandLineProgramTest, UsageErrorEndsWithTwo) {
     ToolProcess process(tool({"decode"}));
     EXPECT_EQ(process.exitStatus(), 2);
     EXPECT_EQ(process.output(), "");
-    EXPECT_EQ(process.errors(), "velmora-log: FILE is required\nsee velmora-log --help\n");
+    EXPECT_EQ(process.errors(), "velmora-log: FILE is required\nvelmora-log --help tells more\n");
 }
 
 TEST_F(CommandLineProgramTest, HelpToAFullDiskIsReported) {

@@ -147,7 +147,7 @@ TEST_F(ConvertCommandTest, OutputWithoutAFormIsAUsageError) {
         EXPECT_EQ(convert({path("drive.pcapng"), out}, 2),
                   "velmora-log: OUT: got " + out +
                       ", wanted a name that ends in .pcapng, .velmora or .dlf\n"
-                      "see velmora-log --help\n");
+                      "velmora-log --help tells more\n");
 }
 
 TEST_F(ConvertCommandTest, FileThatIsThereIsKeptUnlessForced) {
