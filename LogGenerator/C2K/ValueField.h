@@ -18,7 +18,7 @@ enum class Validity : std::uint8_t { Always, WhileConnected };
 
 /// One row of a parser's table, in publishing order. The field's label is a value key.
 struct ValueField {
-    constexpr ValueField(std::string_view key, Place place, TextFormat format,
+    constexpr ValueField(std::string_view key, const Place& place, const TextFormat& format,
                          Validity when = Validity::Always)
         : field{key, place, format}, validity(when) {}
 

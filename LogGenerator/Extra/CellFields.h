@@ -25,7 +25,7 @@ inline constexpr std::int64_t levelNotMeasured = 32767;
 /// One row of the table of what a section shows of a cell in the cell information array. A table has at most
 /// 32 rows.
 struct CellField {
-    constexpr CellField(CellKey cellKey, CellNumber part, std::string_view label, TextFormat format,
+    constexpr CellField(CellKey cellKey, CellNumber part, std::string_view label, const TextFormat& format,
                         std::string_view failureLine)
         : key(cellKey), number(part), field{label, computed, format}, failure(failureLine) {}
 

@@ -153,7 +153,8 @@ TEST(CommandLineTest, UsageErrorsGiveTheFoundAndTheExpectedValue) {
         const auto* words = std::get_if<CommandLine::Notice>(&line.command);
         ASSERT_NE(words, nullptr) << row.message;
         EXPECT_EQ(words->status, 2);
-        EXPECT_EQ(words->text, std::string("velmora-log: ") + row.message + "\nvelmora-log --help tells more\n");
+        EXPECT_EQ(words->text,
+                  std::string("velmora-log: ") + row.message + "\nvelmora-log --help tells more\n");
     }
 }
 
