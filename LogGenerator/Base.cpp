@@ -85,7 +85,7 @@ KeptRecords::Parts Base::partsOf(const View&, const Record&) const {
 }
 
 const View* Base::viewOf(std::uint32_t logCode) const {
-    const std::span<const View> all = views();
+    const std::span<const View> all = _views.empty() ? views() : _views;
     const auto found =
         std::find_if(all.begin(), all.end(), [logCode](const View& view) { return view.code == logCode; });
     return found == all.end() ? nullptr : &*found;
