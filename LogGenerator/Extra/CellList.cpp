@@ -4,7 +4,7 @@
 #include "LogGenerator/Extra/CellList.h"
 
 #include "LogGenerator/Extra/BinaryCellReader.h"
-#include "LogGenerator/Extra/ExtraPayload.h"
+#include "LogGenerator/Extra/CellInfoArray.h"
 #include "LogMessages/LogMessage.h"
 
 #include <algorithm>

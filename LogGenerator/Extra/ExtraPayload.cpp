@@ -3,45 +3,11 @@
 
 #include "LogGenerator/Extra/ExtraPayload.h"
 
-#include "LogMessages/LogMessage.h"
 #include "Platform/SystemLog.h"
-#include "Platform/TelephonyService.h"
-#include "PropertyLists/PropertyList.h"
 
-#include <algorithm>
-#include <cmath>
-#include <limits>
+#include <utility>
 
 namespace velmora {
-
-namespace {
-
-constexpr std::size_t longestCached = std::size_t{1} << 16;
-
-Result<Value> readPayload(const Data& record) {
-    return readPropertyList(record.from(LogMessage::headerLength).bytes());
-}
-
-bool holds(const Dictionary& cell, std::string_view key, std::string_view text) {
-    const std::string* value = cell[key].asString();
-    return value && *value == text;
-}
-
-} // namespace
-
-Result<Value> PayloadCache::read(const Data& record) {
-    const Bytes bytes = record.from(LogMessage::headerLength).bytes();
-    for (const Payload& known : _payloads)
-        if (!known.value.isNone() &&
-            std::equal(bytes.begin(), bytes.end(), known.bytes.begin(), known.bytes.end()))
-            return known.value;
-    Result<Value> payload = readPayload(record);
-    if (payload && bytes.size() <= longestCached) {
-        _payloads[_next] = {{bytes.begin(), bytes.end()}, *payload};
-        _next = (_next + 1) % _payloads.size();
-    }
-    return payload;
-}
 
 LogCode_0xFF0000::SIMFileReader::SIMFileReader(const Data& record, PayloadCache& earlier) {
     Result<Value> payload = earlier.read(record);
@@ -61,45 +27,6 @@ ContextListReader::ContextListReader(const Data& record, PayloadCache& earlier) 
     Result<Value> payload = earlier.read(record);
     if (payload && payload->asArray())
         _contexts = *std::move(payload);
-}
-
-CellInfoArrayReader::CellInfoArrayReader(const Data& record) {
-    if (Result<Value> payload = readPayload(record))
-        _parsed = *std::move(payload);
-    else
-        logLine(LogPriority::Error, "Cell Info Array data could not be constructed");
-}
-
-const Array* CellInfoArrayReader::cells() const {
-    const Array* cells = _parsed.asArray();
-    if (!cells)
-        logLine(LogPriority::Error, "Failed to get Cell Array\n");
-    return cells;
-}
-
-bool isCell(const Value& cell, std::string_view technology, std::string_view type) {
-    const Dictionary* fields = cell.asDictionary();
-    return fields && holds(*fields, kVoxCellMonitorCellRadioAccessTechnology, technology) &&
-           holds(*fields, kVoxCellMonitorCellType, type);
-}
-
-std::optional<std::int32_t> cellNumber(const Dictionary& cell, std::string_view key) {
-    const Value& value = cell[key];
-    if (const std::int64_t* integer = value.asInteger()) {
-        if (*integer < std::numeric_limits<std::int32_t>::min() ||
-            *integer > std::numeric_limits<std::int32_t>::max())
-            return std::nullopt;
-        return static_cast<std::int32_t>(*integer);
-    }
-    if (const double* real = value.asReal()) {
-        // The comparison is false for a value that is not a number.
-        if (!(*real >= std::numeric_limits<std::int32_t>::min() &&
-              *real <= std::numeric_limits<std::int32_t>::max()) ||
-            *real != std::trunc(*real))
-            return std::nullopt;
-        return static_cast<std::int32_t>(*real);
-    }
-    return std::nullopt;
 }
 
 } // namespace velmora

@@ -3,37 +3,16 @@
 
 #pragma once
 
-#include "Platform/Result.h"
+#include "LogGenerator/Extra/PayloadCache.h"
 #include "PropertyLists/Value.h"
 
-#include <array>
-#include <cstddef>
-#include <cstdint>
 #include <exception>
-#include <optional>
 #include <string_view>
-#include <vector>
 
 namespace velmora {
 
-/// The extra stream's payload readers. Each is built from a complete record, reads the property list after
-/// the 13-byte header and keeps the result.
-
-/// A cache of a section's latest payloads and their values. The SIM's files and the contexts are sent
-/// repeatedly without having changed, or as before, alternately in both forms: some of them are cached.
-class PayloadCache {
-public:
-    /// What the record's payload holds, as readPropertyList returns it.
-    [[nodiscard]] Result<Value> read(const Data& record);
-
-private:
-    struct Payload {
-        std::vector<std::uint8_t> bytes;
-        Value value;
-    };
-    std::array<Payload, 8> _payloads;
-    std::size_t _next = 0; ///< which is replaced next
-};
+/// The readers of the SIM's files and of the packet-data contexts. Each is built from a complete record,
+/// reads the property list after the 13-byte header and keeps the result.
 
 namespace LogCode_0xFF0000 {
 
@@ -70,30 +49,5 @@ public:
 private:
     Value _contexts;
 };
-
-/// The cell information array: the cells that the phone sees, as the telephony service describes them.
-class CellInfoArrayReader {
-public:
-    /// Logs "Cell Info Array data could not be constructed" when the payload cannot be read, and then holds
-    /// none.
-    explicit CellInfoArrayReader(const Data& record);
-    /// What the payload holds, whatever its kind.
-    [[nodiscard]] const Value& parsed() const { return _parsed; }
-    /// The cells. Where there is no array - the payload is unreadable or of another kind - null, with the
-    /// error line "Failed to get Cell Array".
-    [[nodiscard]] const Array* cells() const;
-
-private:
-    Value _parsed;
-};
-
-/// Whether `cell` is a dictionary whose radio access technology and cell type are these two. One that
-/// lacks either key is not.
-[[nodiscard]] bool isCell(const Value& cell, std::string_view technology, std::string_view type);
-
-/// A cell's number as a signed 32-bit integer. Absent where the key is missing or its value does not convert:
-/// text, data and booleans are no numbers, and a number that has a fraction or does not fit 32 bits would
-/// show as another one.
-[[nodiscard]] std::optional<std::int32_t> cellNumber(const Dictionary& cell, std::string_view key);
 
 } // namespace velmora

@@ -5,7 +5,7 @@
 
 #include "LogGenerator/Extra/BinaryCellReader.h"
 
-#include "LogGenerator/Extra/ExtraPayload.h"
+#include "LogGenerator/Extra/CellInfoArray.h"
 #include "Platform/TelephonyService.h"
 #include "PropertyLists/PropertyList.h"
 #include "Tests/LogGenerator/Extra/CellTexts.h"

@@ -1,6 +1,7 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
+#include "LogGenerator/Extra/CellInfoArray.h"
 #include "LogGenerator/Extra/ExtraPayload.h"
 #include "LogGenerator/Extra/PDPContextList.h"
 #include "LogGenerator/Extra/SimInfo.h"
