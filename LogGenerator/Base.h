@@ -33,7 +33,7 @@ using CodeDictionary = std::map<std::string, std::vector<Base*>, std::less<>>;
 /// visitor. Its node of the display dictionary is owned by the display; the section only refers to it. Main
 /// thread only.
 ///
-/// On arrival a record is checked, and what is wrong with it is logged. Its fields are written when the
+/// A record is checked on arrival, and its errors are logged. Its fields are written when the
 /// generator hands the display out (`writeNode`) or when the node is requested; see KeptRecords.
 class Base {
 public:

@@ -36,8 +36,8 @@ public:
     [[nodiscard]] virtual std::uint16_t logCode() const = 0;
     /// What such records are called.
     [[nodiscard]] virtual std::string_view name() const = 0;
-    /// Takes one record, prefix removed, of whatever length, on arrival: checks it, logs what is wrong with
-    /// it, and updates the running values. None for a record that publishes nothing; one that is rejected
+    /// Takes one record, prefix removed, of whatever length, on arrival: checks it, logs its
+    /// errors, and updates the running values. None for a record that publishes nothing; one that is rejected
     /// leaves the state as it is. The reading refers to the record's bytes.
     [[nodiscard]] virtual std::optional<Reading> accept(const Record& record, Dictionary& state) const = 0;
     /// Names the values of such a reading to the visitor, in publishing order; those of its parts alone.

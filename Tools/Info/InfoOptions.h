@@ -11,7 +11,7 @@ class App;
 
 namespace velmora {
 
-/// `velmora-log info`: what a file of log messages holds, and what is wrong with it.
+/// `velmora-log info`: what a file of log messages holds, and its damage.
 struct InfoOptions {
     std::string file;
     std::string technology; ///< overrides the file's; empty for the file's
