@@ -4,6 +4,8 @@
 #include "LogGenerator/Base.h"
 
 #include "LogGenerator/ArrayLock.h"
+#include "LogGenerator/Observations/ContentVisitor.h"
+#include "LogGenerator/Observations/Observer.h"
 #include "Platform/SystemLog.h"
 
 #include <algorithm>
@@ -66,6 +68,13 @@ void Base::decode(const View& view, const Record& record, FieldVisitor& visitor)
         visitor.fields(record, *view.table);
 }
 
+void Base::describe(const View& view, ContentVisitor& visitor) const {
+    if (view.table)
+        visitor.fields(view.table->fields);
+    else
+        visitor.contents(view.contents);
+}
+
 void Base::trace() const {
     logLine(LogPriority::Warning, getSectionName());
 }
@@ -104,6 +113,13 @@ bool Base::prepareFor(const View& view, KeptRecords::Parts parts) {
 void Base::keepPrepared(const View& view, const Record& record, KeptRecords::Parts parts) {
     if (_records.keep(indexOf(view), record.bytes(), parts))
         writeNode();
+    if (_observer)
+        observeRecord(view, record);
+}
+
+void Base::observeRecord(const View& view, const Record& record) {
+    if (_observer->beginSection(*_fieldMap, view.code))
+        decode(view, record, *_observer);
 }
 
 void Base::writeNode() {

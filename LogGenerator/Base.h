@@ -21,6 +21,9 @@
 namespace velmora {
 
 class Base;
+class ContentVisitor;
+class FieldMap;
+class Observer;
 
 /// Section name to section. The class index owns the sections.
 using ClassDictionary = std::map<std::string, Base*, std::less<>>;
@@ -59,6 +62,16 @@ public:
     /// Precondition: the record was accepted by `updateWithData`. The default names the fields of the view's
     /// table.
     virtual void decode(const View& view, const Record& record, FieldVisitor& visitor) const;
+
+    /// Describes everything that `decode` may name of records of the view. The default describes the view's
+    /// table or contents.
+    virtual void describe(const View& view, ContentVisitor& visitor) const;
+    /// From now on the observer gets what `decode` names of each accepted record, by the section's map. Null:
+    /// nothing is observed. Both must outlive the section or the next call.
+    void observe(Observer* observer, const FieldMap* map) {
+        _observer = observer;
+        _fieldMap = map;
+    }
 
     /// Sets the section's node, a dictionary or an array.
     void updateSectionRef(const Value& node);
@@ -127,6 +140,7 @@ private:
     /// Writes what the record would replace and has more to show. Whether there is a node to keep it for.
     [[nodiscard]] bool prepareFor(const View& view, KeptRecords::Parts parts);
     void keepPrepared(const View& view, const Record& record, KeptRecords::Parts parts);
+    void observeRecord(const View& view, const Record& record);
     void writeInto(Array& node);
 
     /// A node that the display owns. On the one thread there is, it cannot be destroyed while a record is
@@ -152,6 +166,8 @@ private:
     std::span<const View> _views; ///< as `views` returns them, since there has been a node
     KeptRecords _records;
     DisplayWriter::SpareRows _spareRows;
+    Observer* _observer = nullptr;
+    const FieldMap* _fieldMap = nullptr;
 };
 
 } // namespace velmora

@@ -7,6 +7,7 @@
 
 #include <cstddef>
 #include <cstdint>
+#include <span>
 
 namespace velmora {
 
@@ -17,12 +18,16 @@ struct View {
     /// A table, which must be a constant.
     constexpr View(std::uint32_t logCode, const Layout& layout)
         : code(logCode), minimumLength(layout.minimumLength), table(&layout) {}
-    /// `decode` reads a record of at least this length.
+    /// `decode` reads a record of at least this length and names these contents, a constant.
+    constexpr View(std::uint32_t logCode, std::size_t minimum, std::span<const Content> shown)
+        : code(logCode), minimumLength(minimum), contents(shown) {}
+    /// The same where nothing is named, or the section describes it otherwise (Base::describe).
     constexpr View(std::uint32_t logCode, std::size_t minimum) : code(logCode), minimumLength(minimum) {}
 
     std::uint32_t code;
     std::size_t minimumLength; ///< a shorter record is ignored without a log line
     const Layout* table = nullptr;
+    std::span<const Content> contents{}; ///< what `decode` may name; empty with a table
 };
 
 } // namespace velmora

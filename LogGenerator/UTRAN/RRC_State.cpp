@@ -22,7 +22,8 @@ constexpr EnumText stateRows[] = {
     {3, "Cell DCH"},     {4, "Cell PCH"},   {5, "Cell URA PCH"},
 };
 constexpr EnumTexts states(stateRows, "Unknown RRC Mode");
-constexpr Field state{"State", u8At(14), text(states)};
+constexpr Field state{
+    "State", u8At(14), text(states), {.role = Role::RadioState, .clause = "3GPP TS 25.331 7.1"}};
 static_assert(state.place.end() <= expectedLength);
 
 /// The field of a record that may be too short for it.
@@ -60,7 +61,8 @@ std::int64_t modeOf(const Record& record) {
 }
 
 // A short record is decoded as well, see updateWithData.
-constexpr View sectionViews[] = {{0xD0E0, std::size_t{0}}};
+constexpr Content contents[] = {state};
+constexpr View sectionViews[] = {{0xD0E0, std::size_t{0}, contents}};
 
 } // namespace
 

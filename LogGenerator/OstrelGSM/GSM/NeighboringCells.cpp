@@ -14,9 +14,12 @@ constexpr std::uint32_t measuredCode = 0x5137;
 constexpr std::size_t measuredMinimumLength = 29;
 // ARFCN (3GPP TS 45.005 2), C1 (TS 45.008 6.4); the level is the modem's number, not RXLEV.
 constexpr Field measuredFields[] = {
-    {"ARFCN", u16At(0), integer("%d")},
-    {"RSSI", u8At(2), integer("%d")}, // without a unit
-    {"C1 Value", i32At(3), integer("%d")},
+    {"ARFCN", u16At(0), integer("%d"), {.role = Role::NeighbourChannel, .clause = "3GPP TS 45.005 2"}},
+    {"RSSI",
+     u8At(2),
+     integer("%d"),
+     {.role = Role::NeighbourLevel, .unit = Unit::DBm, .scale = negated}}, // without a unit
+    {"C1 Value", i32At(3), integer("%d"), {.unit = Unit::DB, .clause = "3GPP TS 45.008 6.4"}},
 };
 constexpr Layout measured = layout(14, measuredFields);
 constexpr Place measuredARFCN = measuredFields[0].place;
@@ -25,23 +28,36 @@ constexpr Place measuredARFCN = measuredFields[0].place;
 constexpr std::size_t bsicMinimumLength = 15;
 constexpr std::size_t bsicEntryLength = 4;
 constexpr Place bsicARFCN = u16At(0);
-constexpr Field bsic{"BSIC", u8At(2), integer("%d")};
+constexpr Field bsic{
+    "BSIC", u8At(2), integer("%d"), {.role = Role::NeighbourPhysicalCell, .clause = "3GPP TS 23.003 4.3.2"}};
 static_assert(bsicARFCN.end() <= bsicEntryLength && bsic.place.end() <= bsicEntryLength);
 
 // As the telephony service reports it: twice its number is the level in dBm.
 constexpr CellField serviceFields[] = {
-    {kVoxCellMonitorARFCN, CellNumber::Low16, "ARFCN", integer("%d"),
-     "NeighboringCells: Failed to retrieve ARFCN\n"},
-    {kVoxCellMonitorRSSI, CellNumber::SignedLow16, "RSSI",
-     unless(levelNotMeasured, "", integer("%d dBm", 0, 2)), "NeighboringCells: Failed to retrieve RSSI\n"},
+    {kVoxCellMonitorARFCN,
+     CellNumber::Low16,
+     "ARFCN",
+     integer("%d"),
+     "NeighboringCells: Failed to retrieve ARFCN\n",
+     {.role = Role::NeighbourChannel, .clause = "3GPP TS 45.005 2"}},
+    {kVoxCellMonitorRSSI,
+     CellNumber::SignedLow16,
+     "RSSI",
+     unless(levelNotMeasured, "", integer("%d dBm", 0, 2)),
+     "NeighboringCells: Failed to retrieve RSSI\n",
+     {.role = Role::NeighbourLevel}},
 };
 
 constexpr CellKind serviceKinds[] = {
     {kVoxCellMonitorRadioAccessTechnologyGSM, kVoxCellMonitorCellTypeNeighbor},
 };
-constexpr CellTable serviceCells{serviceKinds, CellTable::Shown::Rows, serviceFields};
+constexpr std::string_view serviceKeys[] = {"ARFCN"};
+constexpr CellTable serviceCells{serviceKinds, CellTable::Shown::Rows, serviceFields, {.keys = serviceKeys}};
 
-constexpr List rows{};
+constexpr Content cellContents[] = {measured, bsic};
+constexpr std::string_view cellKeys[] = {"ARFCN", "BSIC"};
+constexpr List rows{.contents = cellContents, .keys = cellKeys};
+constexpr Content contents[] = {rows};
 
 CountedList measuredCells(const Record& record) {
     return CountedList(record, measuredMinimumLength, measured.minimumLength, record.u8(28));
@@ -56,7 +72,7 @@ CountedList bsicEntries(Bytes entries) {
     return CountedList(Record(entries), 0, bsicEntryLength, entries.size() / bsicEntryLength);
 }
 constexpr View sectionViews[] = {
-    {measuredCode, measuredMinimumLength},
+    {measuredCode, measuredMinimumLength, contents},
     {0x51FF, bsicMinimumLength},
     cellInformation,
 };

@@ -18,6 +18,7 @@ protected:
     [[nodiscard]] std::size_t neededLength(const View& view, const Record& record) const override {
         return Base::neededLength(view, record);
     }
+    [[nodiscard]] std::span<const Content> cellContents() const override;
     void visitCells(const Record& record, FieldVisitor& visitor) const override;
 };
 

@@ -3,6 +3,7 @@
 
 #include "LogGenerator/OstrelGSM/UMTS/SearcherSet.h"
 
+#include "LogGenerator/Observations/ContentVisitor.h"
 #include "LogGenerator/OstrelGSM/UMTS/SearcherRecord.h"
 #include "Platform/SystemLog.h"
 
@@ -13,7 +14,8 @@ using OstrelGSM::SearcherRecord;
 namespace {
 
 constexpr View sectionViews[] = {{SearcherRecord::code, SearcherRecord::minimumLength}};
-constexpr List rows{};
+constexpr std::string_view cellKeys[] = {"Scrambling Code"};
+constexpr List rows{.keys = cellKeys};
 
 } // namespace
 
@@ -32,6 +34,12 @@ void SearcherSet::check(const View&, const Record& record) const {
 void SearcherSet::decode(const View&, const Record& record, FieldVisitor& visitor) const {
     visitor.beginList(rows);
     visitCells(record, visitor);
+    visitor.endList();
+}
+
+void SearcherSet::describe(const View&, ContentVisitor& visitor) const {
+    visitor.beginList(rows);
+    visitor.contents(cellContents());
     visitor.endList();
 }
 

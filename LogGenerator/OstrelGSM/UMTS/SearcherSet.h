@@ -14,6 +14,7 @@ class SearcherSet : public Base {
 public:
     [[nodiscard]] std::span<const View> views() const final;
     void decode(const View& view, const Record& record, FieldVisitor& visitor) const final;
+    void describe(const View& view, ContentVisitor& visitor) const final;
 
 protected:
     /// The set's name in the log.
@@ -21,6 +22,8 @@ protected:
     /// Logs what the record lacks.
     virtual void checkCells(const Record& record) const;
     [[nodiscard]] std::size_t neededLength(const View& view, const Record& record) const override;
+    /// What a row may show.
+    [[nodiscard]] virtual std::span<const Content> cellContents() const { return {}; }
     /// Names the rows of the list.
     virtual void visitCells(const Record& record, FieldVisitor& visitor) const;
 

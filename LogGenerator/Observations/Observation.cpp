@@ -1,0 +1,38 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
+#include "LogGenerator/Observations/Observation.h"
+
+#include <charconv>
+
+namespace velmora {
+
+void Observation::appendPath(std::string& path) const {
+    std::size_t row = 0;
+    const std::string_view pattern = leaf->path;
+    for (std::size_t at = 0; at < pattern.size();) {
+        const std::size_t star = row < rows.size() ? pattern.find("/*", at) : std::string_view::npos;
+        if (star == std::string_view::npos) {
+            path.append(pattern.substr(at));
+            return;
+        }
+        path.append(pattern.substr(at, star + 1 - at));
+        char digits[16];
+        path.append(digits, std::to_chars(digits, digits + sizeof digits, rows[row++]).ptr);
+        at = star + 2;
+    }
+}
+
+ObservedText::ObservedText(const Observation& observation) {
+    switch (observation.text) {
+    case Observation::Text::OfRaw:
+        _view = _formatted.emplace(observation.source->field->format, observation.raw).view();
+        break;
+    case Observation::Text::OfReal:
+        _view = _number.emplace(observation.source->field->format.format, observation.shown).text();
+        break;
+    case Observation::Text::Given: _view = observation.given; break;
+    }
+}
+
+} // namespace velmora
