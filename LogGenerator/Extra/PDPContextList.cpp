@@ -28,7 +28,7 @@ constexpr Field knownFields[] = {
 };
 constexpr Content contextContents[] = {context, knownFields};
 constexpr std::string_view contextKeys[] = {"Context ID"};
-constexpr List contextList{"", List::Entries::Values, "", contextContents, contextKeys};
+constexpr List contextList{"", List::Entries::Values, "", contextContents, contextKeys, true};
 constexpr Content contents[] = {contextList};
 constexpr View contextViews[] = {{ExtraCode::packetDataContexts, 0, contents}};
 

@@ -73,6 +73,7 @@ struct List {
     /// The labels of the fields that identify an entry from record to record, as a channel and a physical
     /// cell do; none where only the index does.
     std::span<const std::string_view> keys{};
+    bool isOpen = false; ///< entries may show more than the contents: they name it themselves
 };
 
 } // namespace velmora

@@ -74,6 +74,18 @@ constexpr KnownField knownFields[] = {
     {"SIM/ICCID", {"", computed, plainText(), {.identity = Identity::Subscriber, .clause = "ITU-T E.118"}}},
 };
 
+/// The rows of a list, and the leaves that identify one.
+struct KnownRows {
+    std::string_view path;
+    std::span<const std::string_view> keys;
+};
+constexpr std::string_view cellKeys[] = {"ARFCN", "BSIC"};
+constexpr std::string_view contextKeys[] = {"Context ID"};
+constexpr KnownRows knownRows[] = {
+    {"Neighbor Cells/*", cellKeys},
+    {"Packet Data/Contexts/*", contextKeys},
+};
+
 Catalogue::Node& nodeAt(Catalogue& catalogue, std::string_view path) {
     Catalogue::Node* node = &catalogue.root();
     while (!path.empty()) {
@@ -87,6 +99,8 @@ Catalogue::Node& nodeAt(Catalogue& catalogue, std::string_view path) {
 } // namespace
 
 void describeKnownFields(Catalogue& catalogue) {
+    for (const KnownRows& known : knownRows)
+        nodeAt(catalogue, known.path).setKeys(known.keys);
     for (const KnownField& known : knownFields) {
         CatalogueField& leaf = catalogue.add(nodeAt(catalogue, known.path), {}, {0, &known.field});
         leaf.isReadFromText = leaf.kind == ObservedKind::Number;

@@ -58,20 +58,20 @@ double physicalScale(const Field& field) {
     return field.means.scale * unitOfSuffix(field.format.format.suffix).value_or(ShownUnit()).scale;
 }
 
-Catalogue::Node* Catalogue::Node::find(std::string_view name) const {
-    for (const std::unique_ptr<Node>& each : _children)
+CatalogueNode* CatalogueNode::find(std::string_view name) const {
+    for (const std::unique_ptr<CatalogueNode>& each : _children)
         if (each->_name == name)
             return each.get();
     return nullptr;
 }
 
-Catalogue::Node& Catalogue::Node::child(std::string_view name) {
-    if (Node* const found = find(name))
+CatalogueNode& CatalogueNode::child(std::string_view name) {
+    if (CatalogueNode* const found = find(name))
         return *found;
-    return *_children.emplace_back(std::make_unique<Node>(name, this));
+    return *_children.emplace_back(std::make_unique<CatalogueNode>(name, this));
 }
 
-std::string Catalogue::Node::path() const {
+std::string CatalogueNode::path() const {
     if (!_parent)
         return "/";
     const std::string parent = _parent->_parent ? _parent->path() : std::string();
@@ -82,8 +82,11 @@ CatalogueField& Catalogue::leafAt(Node& node, std::string_view section) {
     if (!node._leaf) {
         CatalogueField& leaf = _fields.emplace_back();
         leaf.index = _fields.size() - 1;
+        leaf.node = &node;
         leaf.path = node.path();
         leaf.section = section;
+        for (const CatalogueNode* above = &node; above && leaf.keys.empty(); above = above->parent())
+            leaf.keys = above->keys();
         node._leaf = &leaf;
     }
     return *node._leaf;
@@ -103,8 +106,6 @@ CatalogueField& Catalogue::add(Node& node, std::string_view section, const Catal
             leaf.identity = field.means.identity;
         if (leaf.clause.empty())
             leaf.clause = field.means.clause;
-        if (source.list)
-            leaf.keys.assign(source.list->keys.begin(), source.list->keys.end());
     }
     if (field.format.hasSpecial)
         addOnce(leaf.absentTexts, field.format.specialText);

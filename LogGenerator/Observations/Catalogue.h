@@ -10,6 +10,7 @@
 #include <deque>
 #include <map>
 #include <memory>
+#include <span>
 #include <string>
 #include <string_view>
 #include <utility>
@@ -37,18 +38,57 @@ struct CatalogueSource {
     const List* list = nullptr; ///< whose entry the place counts from; null for the record itself
 };
 
+struct CatalogueField;
+
+/// A place in the display: a dictionary's key or, named "*", the rows of a list.
+class CatalogueNode {
+public:
+    CatalogueNode(std::string_view name, CatalogueNode* parent) : _name(name), _parent(parent) {}
+
+    [[nodiscard]] const std::string& name() const { return _name; }
+    /// Null for the root.
+    [[nodiscard]] const CatalogueNode* parent() const { return _parent; }
+    [[nodiscard]] bool isRow() const { return _name == "*"; }
+    /// Null where nothing is shown here itself.
+    [[nodiscard]] CatalogueField* leaf() const { return _leaf; }
+    /// The child of that name; null where there is none.
+    [[nodiscard]] CatalogueNode* find(std::string_view name) const;
+    /// The child of that name, which is made where there is none.
+    [[nodiscard]] CatalogueNode& child(std::string_view name);
+    [[nodiscard]] CatalogueNode& rows() { return child("*"); }
+    [[nodiscard]] std::string path() const;
+    /// Whether messages name leaves of their own below this node.
+    [[nodiscard]] bool isOpen() const { return _isOpen; }
+    void setOpen() { _isOpen = true; }
+    [[nodiscard]] const std::vector<std::unique_ptr<CatalogueNode>>& children() const { return _children; }
+    /// Of a list's rows: the names of the leaves that identify one.
+    [[nodiscard]] std::span<const std::string_view> keys() const { return _keys; }
+    /// The names must be constants.
+    void setKeys(std::span<const std::string_view> keys) { _keys = keys; }
+
+private:
+    friend class Catalogue;
+    std::string _name;
+    CatalogueNode* _parent;
+    CatalogueField* _leaf = nullptr;
+    bool _isOpen = false;
+    std::span<const std::string_view> _keys;
+    std::vector<std::unique_ptr<CatalogueNode>> _children;
+};
+
 /// A leaf of the display: one row of the catalogue.
 struct CatalogueField {
     std::size_t index = 0; ///< in the catalogue
-    std::string path;      ///< in the display, "*" for a row of a list: "/GSM/Neighboring Cells/*/RSSI"
-    std::string section;   ///< empty where the technology has no sections
+    const CatalogueNode* node = nullptr;
+    std::string path;    ///< in the display, "*" for a row of a list: "/GSM/Neighboring Cells/*/RSSI"
+    std::string section; ///< empty where the technology has no sections
     std::deque<CatalogueSource> sources; ///< each stays where it is
     ObservedKind kind = ObservedKind::Text;
     Unit unit = Unit::None;
     Role role = Role::None;
     Identity identity = Identity::None;
     std::string_view clause;
-    std::vector<std::string_view> keys; ///< the labels that identify its row
+    std::span<const std::string_view> keys; ///< the names of the leaves that identify its row
     std::vector<std::string> absentTexts;
     std::string sameAs;          ///< the path that shows the same value first; empty for none
     bool isReadFromText = false; ///< its number is read from a text, since the messages hold nothing else
@@ -58,33 +98,7 @@ struct CatalogueField {
 /// grows only where messages name their own leaves, as free trees do. Main thread only.
 class Catalogue {
 public:
-    /// A place in the display: a dictionary's key or, named "*", the rows of a list.
-    class Node {
-    public:
-        Node(std::string_view name, Node* parent) : _name(name), _parent(parent) {}
-
-        [[nodiscard]] const std::string& name() const { return _name; }
-        /// Null where nothing is shown here itself.
-        [[nodiscard]] CatalogueField* leaf() const { return _leaf; }
-        /// The child of that name; null where there is none.
-        [[nodiscard]] Node* find(std::string_view name) const;
-        /// The child of that name, which is made where there is none.
-        [[nodiscard]] Node& child(std::string_view name);
-        [[nodiscard]] Node& rows() { return child("*"); }
-        [[nodiscard]] std::string path() const;
-        /// Whether messages name leaves of their own below this node.
-        [[nodiscard]] bool isOpen() const { return _isOpen; }
-        void setOpen() { _isOpen = true; }
-        [[nodiscard]] const std::vector<std::unique_ptr<Node>>& children() const { return _children; }
-
-    private:
-        friend class Catalogue;
-        std::string _name;
-        Node* _parent;
-        CatalogueField* _leaf = nullptr;
-        bool _isOpen = false;
-        std::vector<std::unique_ptr<Node>> _children;
-    };
+    using Node = CatalogueNode;
 
     explicit Catalogue(std::string_view technology) : _technology(technology), _root("", nullptr) {}
     Catalogue(const Catalogue&) = delete;
@@ -93,6 +107,7 @@ public:
     /// The technology's short name.
     [[nodiscard]] const std::string& technology() const { return _technology; }
     [[nodiscard]] Node& root() { return _root; }
+    [[nodiscard]] const Node& root() const { return _root; }
     /// In the order of the display. Grows at the end; what is in it stays where it is.
     [[nodiscard]] const std::deque<CatalogueField>& fields() const { return _fields; }
 

@@ -43,6 +43,9 @@ void CatalogueWriter::beginList(const List& list) {
     for (Catalogue::Node* const node : lists) {
         _map.add(FieldMap::ListEntry{_levels.empty() ? nullptr : _levels.back().list, &list, node});
         level.rows.push_back(&node->rows());
+        node->rows().setKeys(list.keys);
+        if (list.isOpen)
+            node->rows().setOpen();
         if (list.whenEmpty.empty())
             continue;
         CatalogueField& leaf = _catalogue.leafAt(*node, _map.section());

@@ -23,16 +23,16 @@ void Observation::appendPath(std::string& path) const {
     }
 }
 
-ObservedText::ObservedText(const Observation& observation) {
+std::string_view ObservedText::of(const Observation& observation) {
     switch (observation.text) {
     case Observation::Text::OfRaw:
-        _view = _formatted.emplace(observation.source->field->format, observation.raw).view();
-        break;
+        return _formatted.emplace(observation.source->field->format, observation.raw).view();
     case Observation::Text::OfReal:
-        _view = _number.emplace(observation.source->field->format.format, observation.shown).text();
-        break;
-    case Observation::Text::Given: _view = observation.given; break;
+        _number.format(observation.source->field->format.format, observation.shown);
+        return _number.text();
+    case Observation::Text::Given: break;
     }
+    return observation.given;
 }
 
 } // namespace velmora

@@ -40,19 +40,16 @@ struct Observation {
     void appendPath(std::string& path) const;
 };
 
-/// The display text of an observation, in storage of its own where it is made from the value.
+/// Makes the display texts of observations.
 class ObservedText {
 public:
-    explicit ObservedText(const Observation& observation);
-    ObservedText(const ObservedText&) = delete;
-    ObservedText& operator=(const ObservedText&) = delete;
-
-    [[nodiscard]] std::string_view view() const { return _view; }
+    /// Valid until the next call, and no longer than the observation.
+    [[nodiscard]] std::string_view of(const Observation& observation);
 
 private:
+    // Kept, so that their storage is not initialized for each text.
     std::optional<FormattedText> _formatted;
-    std::optional<NumberText> _number;
-    std::string_view _view;
+    NumberText _number;
 };
 
 /// A list that a message replaced, with however many rows.

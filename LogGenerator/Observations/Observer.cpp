@@ -161,10 +161,13 @@ void Observer::setCode(const Field& field, std::string_view digits, Observation&
 void Observer::supplied(const Field& field, const Value& value) {
     beginValue();
     for (const FieldMap::Entry& entry : _map->find(currentList(), field)) {
-        if (value.asDictionary() || value.asArray())
+        if (value.asDictionary() || value.asArray()) {
+            const std::size_t first = _observations.size();
             tree(_map->catalogue(), *entry.node, _map->section(), value);
-        else
+            setKey(first, entry.node->keys());
+        } else {
             leaf(*entry.node->leaf(), value);
+        }
     }
 }
 
@@ -209,7 +212,9 @@ void Observer::tree(Catalogue& catalogue, Catalogue::Node& node, std::string_vie
         for (std::size_t i = 0; i < array->size(); ++i) {
             _row = outer;
             newRow(static_cast<std::uint32_t>(i));
+            const std::size_t first = _observations.size();
             tree(catalogue, node.rows(), section, (*array)[i]);
+            setKey(first, node.rows().keys());
         }
         _row = outer;
     } else if (!value.isNone()) {
@@ -264,16 +269,20 @@ void Observer::beginRow() {
 void Observer::endRow() {
     const Level& level = _levels.back();
     _row = level.outerRow;
-    if (level.list->keys.empty())
+    setKey(level.firstOfRow, level.list->keys);
+}
+
+void Observer::setKey(std::size_t first, std::span<const std::string_view> names) {
+    if (names.empty() || first == _observations.size())
         return;
-    const std::span<Observation> row(_observations.begin() + static_cast<std::ptrdiff_t>(level.firstOfRow),
-                                     _observations.end());
+    const std::span<Observation> row(&_observations[first], _observations.size() - first);
+    const std::size_t depth = row.front().rows.size();
     std::string& key = _texts.add();
-    for (const std::string_view label : level.list->keys)
+    for (const std::string_view name : names)
         for (const Observation& each : row)
-            if (each.source && each.source->list == level.list && each.source->field->label == label) {
+            if (each.rows.size() == depth && each.leaf->node->name() == name) {
                 key += key.empty() ? "" : "/";
-                key += ObservedText(each).view();
+                key += _keyText.of(each);
                 break;
             }
     for (Observation& each : row)

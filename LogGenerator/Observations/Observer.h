@@ -63,6 +63,8 @@ private:
     void forEachLeaf(const Field& field, Observe observe);
     Observation& add(const CatalogueField& leaf, const CatalogueSource* source);
     void setCode(const Field& field, std::string_view digits, Observation& observation) const;
+    /// Sets what identifies the row of the observations from `first` on, by the leaves of these names.
+    void setKey(std::size_t first, std::span<const std::string_view> names);
     /// A value of a list without rows begins.
     void beginValue();
     void newRow(std::uint32_t number);
@@ -75,6 +77,7 @@ private:
     std::vector<const CatalogueField*> _removed;
     std::vector<Level> _levels;
     TextArena _texts;
+    ObservedText _keyText;
     std::deque<RowNumbers> _rows; ///< the numbers of each row, a storage that is used again
     std::size_t _usedRows = 0;
     const RowNumbers* _row = nullptr; ///< the current one; null outside of lists

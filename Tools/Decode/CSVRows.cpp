@@ -4,6 +4,7 @@
 #include "Tools/Decode/CSVRows.h"
 
 #include "Tools/Text/CSVText.h"
+#include "Tools/Text/JSONText.h"
 
 namespace velmora {
 
@@ -31,9 +32,9 @@ void CSVRows::didRefresh(Time tick, const Decoded& decoded) {
 std::string CSVRows::header(const DecodeOptions& options) {
     TextBuffer row;
     row.append(options.files.size() > 1 ? "time,file" : "time");
-    for (const std::string& path : options.selection.paths()) {
+    for (const std::string& name : options.selection.names()) {
         row.append(',');
-        appendCsvText(row, path);
+        appendCsvText(row, name);
     }
     row.append(csvRowEnd);
     return std::string(row.view());
@@ -44,9 +45,28 @@ void CSVRows::writeRow(Time moment, const Value& display) {
     line().append(_fileCell);
     for (const std::string& path : _options.selection.paths()) {
         line().append(',');
-        appendCsvCell(line(), NodeSelection::find(display, path));
+        if (NodeSelection::hasWildcard(path))
+            appendAll(display, path);
+        else
+            appendCsvCell(line(), NodeSelection::find(display, path));
     }
     endLine(csvRowEnd);
+}
+
+void CSVRows::appendAll(const Value& display, const std::string& path) {
+    _found.clear();
+    NodeSelection::findAll(display, path, _found);
+    _cell.clear();
+    for (const Value* const value : _found) {
+        if (_cell.size() > 0)
+            _cell.append("; ");
+        if (const std::string* const text = value->asString())
+            _cell.append(*text);
+        else
+            appendJson(_cell, *value);
+    }
+    if (!_found.empty())
+        appendCsvText(line(), _cell.view());
 }
 
 } // namespace velmora

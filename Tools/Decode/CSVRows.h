@@ -6,6 +6,7 @@
 #include "Tools/Text/LineWriter.h"
 
 #include <string>
+#include <vector>
 
 namespace velmora {
 
@@ -25,9 +26,13 @@ public:
 
 private:
     void writeRow(Time moment, const Value& display);
+    /// The cell of a path with "*": all its values, with "; " between them.
+    void appendAll(const Value& display, const std::string& path);
 
     const DecodeOptions& _options;
     std::string _fileCell;
+    std::vector<const Value*> _found;
+    TextBuffer _cell;
 };
 
 } // namespace velmora

@@ -35,6 +35,18 @@ void checkTogether(const DecodeOptions& options) {
     using Format = DecodeOptions::Format;
     const bool hasSelection = !options.selection.paths().empty();
     const bool everyMessage = options.every == DecodeOptions::Every::Message;
+    if (options.samples != DecodeOptions::Samples::None) {
+        const bool isWide = options.samples == DecodeOptions::Samples::Wide;
+        if (isWide && options.format != Format::Csv)
+            throw CLI::ValidationError("--wide", "got another format, wanted --format csv");
+        if (isWide && !hasSelection)
+            throw CLI::ValidationError("--wide", "got no --select, wanted one for each column");
+        if (options.format != Format::JsonLines && options.format != Format::Csv)
+            throw CLI::ValidationError("--samples", "got another format, wanted --format jsonl or csv");
+        if (everyMessage)
+            throw CLI::ValidationError("--samples", "got --every message too, wanted one of the two");
+        return;
+    }
     if (options.format == Format::Csv && !hasSelection)
         throw CLI::ValidationError("--format csv", "got no --select, wanted one for each column");
     if (everyMessage && options.format != Format::JsonLines && options.format != Format::Csv)
@@ -75,6 +87,18 @@ CLI::App* addDecode(CLI::App& app, DecodeOptions& options) {
             "row; the default is refresh")
         ->check(oneOf({"refresh", "message"}))
         ->type_name("refresh|message");
+    using Samples = DecodeOptions::Samples;
+    CLI::Option* const samples = command->add_flag_callback(
+        "--samples",
+        [&options] { options.samples = options.samples == Samples::Wide ? Samples::Wide : Samples::Long; },
+        "jsonl and csv have a line for each value that a message reported, in the catalogue's unit and sign "
+        "(velmora-log fields), instead of the display");
+    command
+        ->add_flag_callback(
+            "--wide", [&options] { options.samples = Samples::Wide; },
+            "With --samples and csv: a row for each message that reported a selected value, a column for "
+            "each selected leaf, a row of its own for each row of a list")
+        ->needs(samples);
     command
         ->add_option_function<std::vector<std::string>>(
             "--select",

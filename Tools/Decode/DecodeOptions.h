@@ -28,7 +28,10 @@ struct DecodeOptions {
 
     Format format = Format::Text;
     Every every = Every::Refresh; ///< `Message` for JsonLines and Csv alone
-    NodeSelection selection;      ///< not empty for Csv; empty for JsonLines with `Message`
+    /// Observations instead of the display: none, a line for each value (JsonLines and Csv), or a row for
+    /// each message (Csv).
+    enum class Samples { None, Long, Wide } samples = Samples::None;
+    NodeSelection selection; ///< not empty for Csv without samples
     TimeRange range;
     std::string technology; ///< overrides the file's; empty for the file's
     std::size_t jobs = 1;   ///< how many files are decoded in parallel

@@ -6,6 +6,8 @@
 #include "Tools/Decode/CSVRows.h"
 #include "Tools/Decode/FinalDisplay.h"
 #include "Tools/Decode/JSONLines.h"
+#include "Tools/Decode/Samples/SampleWriter.h"
+#include "Tools/Decode/Samples/WideRows.h"
 #include "Tools/Output.h"
 
 #include <utility>
@@ -13,9 +15,16 @@
 namespace velmora {
 
 std::unique_ptr<DecodeWriter> DecodeWriter::make(const DecodeOptions& options, const std::string& file,
-                                                 bool isLive, std::string heading, Output& output) {
+                                                 bool isLive, std::string heading, SampleColumns& columns,
+                                                 Output& output) {
     using Format = DecodeOptions::Format;
     const std::string named = options.files.size() > 1 ? file : std::string();
+    if (options.samples == DecodeOptions::Samples::Wide)
+        return std::make_unique<WideRows>(output, isLive, options, named, columns);
+    if (options.samples == DecodeOptions::Samples::Long && options.format == Format::Csv)
+        return std::make_unique<SampleRows>(output, isLive, options, named);
+    if (options.samples == DecodeOptions::Samples::Long)
+        return std::make_unique<SampleLines>(output, isLive, options, named);
     switch (options.format) {
     case Format::JsonLines:
         if (options.every == DecodeOptions::Every::Message)

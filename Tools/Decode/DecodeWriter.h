@@ -12,15 +12,18 @@
 namespace velmora {
 
 class Output;
+class SampleColumns;
 
 /// What `decode` prints of a file, in one of its formats: during decoding or at its end.
 class DecodeWriter : public DecodingObserver {
 public:
     /// The writer of the options' format. `isLive`: more may still be written to the file, as to a pipe.
-    /// `heading` goes before the text format. `options` and `output` must outlive it.
+    /// `heading` goes before the text format. `columns`: those of wide samples. `options`, `columns` and
+    /// `output` must outlive it.
     [[nodiscard]] static std::unique_ptr<DecodeWriter> make(const DecodeOptions& options,
                                                             const std::string& file, bool isLive,
-                                                            std::string heading, Output& output);
+                                                            std::string heading, SampleColumns& columns,
+                                                            Output& output);
 
     /// The file has been decoded to its end.
     virtual void finish(const Decoded&) {}

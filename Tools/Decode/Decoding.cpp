@@ -26,6 +26,7 @@ Result<Decoded> decodeMessages(MessageReader& reader, const DecodingRequest& req
     if (!decoder)
         return Failure{decoder.reason() + (named.empty() ? "; --technology supplies it" : "")};
 
+    observer.didMakeDecoder(**decoder);
     bool keepsHistory = observer.wantsHistory(0);
     (*decoder)->setKeepsHistory(keepsHistory);
     const bool wantsEveryRefresh = observer.wantsEveryRefresh();

@@ -33,6 +33,8 @@ class DecodingObserver {
 public:
     virtual ~DecodingObserver() = default;
 
+    /// The decoder of the file's technology is there; called once, before anything is decoded.
+    virtual void didMakeDecoder(LogGenerator& /*decoder*/) {}
     /// Called before a message in the range is decoded.
     virtual void willDecode(const LoggedMessage&) {}
     /// The observer of each message's effects; called once. Null for none, which makes decoding faster.

@@ -26,6 +26,7 @@ protected:
     /// The current line is appended here.
     [[nodiscard]] TextBuffer& line() { return _lines; }
     void appendTime(Time moment) { _time.append(_lines, moment); }
+    void appendTime(TextBuffer& out, Time moment) { _time.append(out, moment); }
     void endLine(std::string_view end);
 
 private:
