@@ -18,6 +18,8 @@
 
 namespace velmora {
 
+class Dictionary;
+
 /// Gathers what the decode functions name of a message as observations. Once messages repeat, it allocates
 /// nothing. What a map does not have, since the display has no place for it, is not observed.
 class Observer final : public FieldVisitor {
@@ -63,12 +65,15 @@ private:
     void forEachLeaf(const Field& field, Observe observe);
     Observation& add(const CatalogueField& leaf, const CatalogueSource* source);
     void setCode(const Field& field, std::string_view digits, Observation& observation) const;
+    /// The observations from that one on are of a row that was supplied as a dictionary.
+    void setRowKey(std::size_t first, const Dictionary& row);
     /// A value of a list without rows begins.
     void beginValue();
     void newRow(std::uint32_t number);
     void leaf(const CatalogueField& leaf, const Value& value);
 
     const FieldMap* _map = nullptr;
+    std::uint32_t _code = 0; ///< of the record whose fields are named
     std::vector<std::pair<const FieldMap*, std::uint32_t>> _sections; ///< of this message
     std::vector<Observation> _observations;
     std::vector<ObservedList> _lists;
