@@ -39,13 +39,18 @@ void CatalogueWriter::beginList(const List& list) {
     else
         for (Catalogue::Node* const row : _levels.back().rows)
             lists.push_back(&row->child(list.label));
+    const List* const outer = _levels.empty() ? nullptr : _levels.back().list;
     Level level{&list, {}};
+    // A list of several codes has been entered with the first.
+    const bool isNew = _map.findList(outer, list).empty();
     for (Catalogue::Node* const node : lists) {
-        _map.add(FieldMap::ListEntry{_levels.empty() ? nullptr : _levels.back().list, &list, node});
         level.rows.push_back(&node->rows());
         node->rows().setKeys(list.keys);
         if (list.isOpen)
             node->rows().setOpen();
+        if (!isNew)
+            continue;
+        _map.add(FieldMap::ListEntry{outer, &list, node});
         if (list.whenEmpty.empty())
             continue;
         CatalogueField& leaf = _catalogue.leafAt(*node, _map.section());

@@ -36,14 +36,23 @@ std::int64_t signedAsMeant(const Field& field, std::int64_t raw) {
     return field.means.sign == Sign::Signed && unsignedRaw >= range / 2 ? unsignedRaw - range : unsignedRaw;
 }
 
-/// The number that the format shows before its text is made.
-double shownNumber(const TextFormat& format, std::int64_t raw) {
+/// The number that the field's format shows, but with the sign that it means.
+double shownNumber(const Field& field, std::int64_t raw) {
+    const TextFormat& format = field.format;
+    const std::int64_t meant = signedAsMeant(field, raw);
     switch (format.kind) {
-    case TextFormat::Kind::Integer:
-        return static_cast<double>(raw * static_cast<std::int64_t>(format.scale) +
-                                   static_cast<std::int64_t>(format.offset));
-    case TextFormat::Kind::Real: return static_cast<double>(raw) * format.scale + format.offset;
-    default: return static_cast<double>(raw);
+    case TextFormat::Kind::Integer: {
+        const std::int64_t shown =
+            meant * static_cast<std::int64_t>(format.scale) + static_cast<std::int64_t>(format.offset);
+        if (field.means.sign != Sign::AsShown)
+            return static_cast<double>(shown);
+        // An integer is shown in 32 bits, whatever the record holds.
+        return format.format.conversion == 'u' ? static_cast<double>(static_cast<std::uint32_t>(shown))
+                                               : static_cast<double>(static_cast<std::int32_t>(shown));
+    }
+    case TextFormat::Kind::Real: return static_cast<double>(meant) * format.scale + format.offset;
+    case TextFormat::Kind::Hexadecimal: return static_cast<double>(static_cast<std::uint32_t>(meant));
+    default: return static_cast<double>(meant);
     }
 }
 
@@ -74,6 +83,7 @@ bool Observer::beginSection(const FieldMap& map, std::uint32_t code) {
         return false;
     _sections.push_back(section);
     _map = &map;
+    _code = code;
     return true;
 }
 
@@ -97,7 +107,8 @@ template <class Observe>
 void Observer::forEachLeaf(const Field& field, Observe observe) {
     beginValue();
     for (const FieldMap::Entry& entry : _map->find(currentList(), field))
-        observe(entry, add(*entry.node->leaf(), entry.source));
+        if (entry.source->code == _code)
+            observe(entry, add(*entry.node->leaf(), entry.source));
 }
 
 void Observer::fields(const Record& record, const Layout& layout) {
@@ -113,8 +124,7 @@ void Observer::number(const Field& field, std::int64_t raw) {
             return; // absent
         observation.kind = entry.kind;
         if (entry.kind == ObservedKind::Number) {
-            observation.number =
-                shownNumber(field.format, signedAsMeant(field, raw)) * entry.scale + entry.offset;
+            observation.number = shownNumber(field, raw) * entry.scale + entry.offset;
         } else if (entry.kind == ObservedKind::Text) {
             std::string& digits = _texts.add();
             if (raw >= 0 && raw <= largestCode)
@@ -161,6 +171,8 @@ void Observer::setCode(const Field& field, std::string_view digits, Observation&
 void Observer::supplied(const Field& field, const Value& value) {
     beginValue();
     for (const FieldMap::Entry& entry : _map->find(currentList(), field)) {
+        if (entry.source->code != _code)
+            continue;
         if (value.asDictionary() || value.asArray()) {
             const std::size_t first = _observations.size();
             tree(_map->catalogue(), *entry.node, _map->section(), value);

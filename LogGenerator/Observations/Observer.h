@@ -18,6 +18,8 @@
 
 namespace velmora {
 
+class Dictionary;
+
 /// Gathers what the decode functions name of a message as observations. Once messages repeat, it allocates
 /// nothing. What a map does not have, since the display has no place for it, is not observed.
 class Observer final : public FieldVisitor {
@@ -71,6 +73,7 @@ private:
     void leaf(const CatalogueField& leaf, const Value& value);
 
     const FieldMap* _map = nullptr;
+    std::uint32_t _code = 0; ///< of the record whose fields are named
     std::vector<std::pair<const FieldMap*, std::uint32_t>> _sections; ///< of this message
     std::vector<Observation> _observations;
     std::vector<ObservedList> _lists;

@@ -33,9 +33,10 @@ std::optional<TextNumber> readTextNumber(std::string_view text) {
     const std::optional<Unit> unit = blank == text.size() ? Unit::None : unitNamed(unitName);
     if (!unit)
         return std::nullopt;
-    if (number.starts_with('+'))
+    const bool isSigned = number.starts_with('-') || number.starts_with('+');
+    const std::string_view digits = number.substr(isSigned ? 1 : 0);
+    if (number.starts_with('+')) // which std::from_chars does not take
         number.remove_prefix(1);
-    const std::string_view digits = number.substr(number.starts_with('-') ? 1 : 0);
     if (digits.empty() || !isDigit(digits.front()) || !isDigit(digits.back()))
         return std::nullopt;
     if (digits.size() > 1 && digits[0] == '0' && digits[1] != '.')
