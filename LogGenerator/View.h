@@ -16,12 +16,15 @@ namespace velmora {
 struct View {
     /// A table, which must be a constant.
     constexpr View(std::uint32_t logCode, const Layout& layout)
-        : code(logCode), minimumLength(layout.minimumLength), table(&layout) {}
-    /// `decode` reads a record of at least this length.
-    constexpr View(std::uint32_t logCode, std::size_t minimum) : code(logCode), minimumLength(minimum) {}
+        : code(logCode), minimumLength(layout.minimumLength), readLength(layout.minimumLength),
+          table(&layout) {}
+    /// `decode` reads a record of at least the minimum length, and nothing past `read` bytes of it.
+    constexpr View(std::uint32_t logCode, std::size_t minimum, std::size_t read = SIZE_MAX)
+        : code(logCode), minimumLength(minimum), readLength(read) {}
 
     std::uint32_t code;
     std::size_t minimumLength; ///< a shorter record is ignored without a log line
+    std::size_t readLength;    ///< all that is kept of a longer record
     const Layout* table = nullptr;
 };
 

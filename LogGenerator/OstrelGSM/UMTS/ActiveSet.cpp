@@ -20,7 +20,13 @@ constexpr Field scramblingCode{"Scrambling Code", SearcherRecord::scramblingCode
 constexpr Field codePower{"RSCP", computed, integer("%d dB")};
 constexpr Field energyPerChip{"Energy Per Chip", computed, integer("%d dB")};
 
+constexpr View sectionViews[] = {{SearcherRecord::code, SearcherRecord::minimumLength}};
+
 } // namespace
+
+std::span<const View> ActiveSet::views() const {
+    return sectionViews;
+}
 
 void ActiveSet::checkCells(const Record& record) const {
     // The measurements follow the cells: a complete one has its cell inside the record too.

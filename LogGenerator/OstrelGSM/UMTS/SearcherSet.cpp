@@ -12,7 +12,7 @@ using OstrelGSM::SearcherRecord;
 
 namespace {
 
-constexpr View sectionViews[] = {{SearcherRecord::code, SearcherRecord::minimumLength}};
+constexpr View sectionViews[] = {{SearcherRecord::code, SearcherRecord::minimumLength, 0}};
 constexpr List rows{};
 
 } // namespace
@@ -37,10 +37,6 @@ void SearcherSet::decode(const View&, const Record& record, FieldVisitor& visito
 
 void SearcherSet::checkCells(const Record& record) const {
     reportMissingEntries(SearcherRecord(record).cells(), SearcherRecord::code);
-}
-
-std::size_t SearcherSet::neededLength(const View&, const Record&) const {
-    return 0;
 }
 
 void SearcherSet::visitCells(const Record&, FieldVisitor&) const {}
