@@ -4,7 +4,7 @@
 #include "Telephony/Drives/LTE/LTEScenario.h"
 
 #include "Platform/TelephonyService.h"
-#include "Tests/Telephony/Drives/DisplayTesting.h"
+#include "Tests/Telephony/Drives/Displays/DisplayTesting.h"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>

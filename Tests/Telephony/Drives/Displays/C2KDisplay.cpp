@@ -3,7 +3,7 @@
 
 #include "Platform/TelephonyService.h"
 #include "Tests/Telephony/Drives/C2KLayouts.h"
-#include "Tests/Telephony/Drives/DisplayTesting.h"
+#include "Tests/Telephony/Drives/Displays/DisplayTesting.h"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
