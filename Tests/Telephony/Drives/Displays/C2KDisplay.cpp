@@ -1,133 +1,94 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Platform/TelephonyService.h"
 #include "Tests/Telephony/Drives/C2KLayouts.h"
-#include "Tests/Telephony/Drives/Displays/DisplayTesting.h"
-
-#include <gmock/gmock.h>
-#include <gtest/gtest.h>
-
-#include <algorithm>
-#include <map>
-#include <set>
-#include <string>
+#include "Tests/Telephony/Drives/Displays/ExpectedDisplays.h"
 
 namespace velmora {
+
 namespace {
 
-using namespace c2k;
-using ::testing::MatchesRegex;
-
-/// The scenario through the technology's decoder, with the template that is shipped.
-class C2KDisplayTest : public DisplayTest {
-protected:
-    C2KDisplayTest() : DisplayTest(kVoxLogChannelTechnology_Ostrel_CDMA, "C2KTemplate") {
-        static_cast<void>(decoder->generateLogUsingState(state)); // builds the display
-    }
-
-    /// Puts every text of the display under its path: "/1x/Channel". Pilots stand under their list's.
-    static void collect(const Value& level, const std::string& path,
-                        std::map<std::string, std::set<std::string>>& texts) {
-        if (const std::string* text = level.asString())
-            texts[path].insert(*text);
-        if (const Dictionary* entries = level.asDictionary())
-            for (const auto& [key, value] : *entries)
-                if (key != "_sorted")
-                    collect(value, key.find(';') == std::string::npos ? path + "/" + key : path, texts);
-    }
-};
-
-TEST_F(C2KDisplayTest, onlyUnusualMessagesAreReported) {
-    int reported = 0;
-    for (const ScenarioEvent& event : twentyMinutes()) {
-        const CapturedLog log(LogPriority::Warning);
-        decoder->updateState(state, event.message);
-        const auto header = LogMessage::parse(event.message.bytes());
-        const bool odd =
-            header && layouts.contains(header->logCode()) && (header->type == 2 || !isWellFormed(*header));
-        EXPECT_EQ(!log.lines().empty(), odd) << (log.lines().empty() ? "" : log.lines()[0].text);
-        reported += odd;
-    }
-    EXPECT_GE(reported, 40);
-    EXPECT_LE(reported, 90);
+/// The decoder reports every message that is not as its layout says.
+bool isUnusual(const Data& message) {
+    const auto header = LogMessage::parse(message.bytes());
+    return header && c2k::layouts.contains(header->logCode()) &&
+           (header->type == 2 || !c2k::isWellFormed(*header));
 }
 
-TEST_F(C2KDisplayTest, everyLabelIsFilledAndPlausible) {
-    std::map<std::string, std::set<std::string>> texts;
-    std::size_t count = 0;
-    for (const ScenarioEvent& event : twentyMinutes()) {
-        decoder->updateState(state, event.message);
-        if (++count % 10 == 0)
-            collect(decoder->display(state), "", texts);
-    }
+} // namespace
+
+ExpectedDisplay expectedC2KDisplay() {
+    using testing::AllOf;
+    using testing::Contains;
+    using testing::Each;
+    using testing::Ge;
+    using testing::Le;
+    using testing::SizeIs;
+
     const char* const level = "[+-][0-9]+ dBm|N/A";
     const char* const fineLevel = "[+-][0-9]+\\.[0-9][0-9] dBm|N/A";
     const char* const rate = "[0-9]+\\.[0-9][0-9] kbps";
     const char* const band = "800 MHz cellular band .0.|1.8 to 2.0GHz PCS band .1.";
-    const std::map<std::string, std::string> expected = {
-        {"/Overview/1x State", "[A-Z].* .[0-9]+."},
-        {"/Overview/EV-DO State", "[A-Z][a-z]+ .[0-5]."},
-        {"/Overview/Roaming Indicator", "OFF .0.|Flashing .2."},
-        {"/Overview/System ID", "3200[12]|.unknown system type 0."},
-        {"/Overview/Network ID", "[12][12]|.unknown system type 0."},
-        {"/Overview/Forward Link Rate", rate},
-        {"/Overview/Reverse Link Rate", rate},
-        {"/System/System ID", "3200[12]|.unknown system type 0."},
-        {"/System/Network ID", "[12][12]|.unknown system type 0."},
-        {"/System/Base Station ID", "[0-9]+"},
-        {"/System/Packet Zone ID", "[0127]"},
-        {"/System/Roaming Indicator", "OFF .0.|Flashing .2."},
-        {"/System/Protocol Revision", "[06]"},
-        {"/1x/Device State", "[A-Z].* .[0-9]+."},
-        {"/1x/Band Class", band},
-        {"/1x/Channel", "0|283|375"},
-        {"/1x/Rx AGC", fineLevel},
-        {"/1x/Tx AGC", fineLevel},
-        {"/1x/Frame Error Rate", "[0-9]\\.[0-9][0-9]%|[0-9]\\.[0-9][0-9]% .old."},
-        {"/1x/Active Set", "(.ref pilot. )?-[0-9]+\\.[0-9][0-9] dB"},
-        {"/1x/Second Receiver/Band Class", "N/A|800 MHz cellular band .0.|1.8 to 2.0GHz PCS band .1."},
-        {"/1x/Second Receiver/Channel", "N/A|283|375"},
-        {"/1x/Second Receiver/Rx AGC", fineLevel},
-        {"/EV-DO/Device State", "[A-Z][a-z]+ .[0-5]."},
-        {"/EV-DO/Session State", "[A-Z].* .[0-4]."},
-        {"/EV-DO/Band Class", band},
-        {"/EV-DO/Channel", "0|78|425"},
-        {"/EV-DO/Serving PN Offset", "Invalid Value|[0-9]+ \u00D7 64chips"},
-        {"/EV-DO/Rx AGC 0", level},
-        {"/EV-DO/Rx AGC 1", level},
-        {"/EV-DO/Tx AGC", level},
-        {"/EV-DO/Active Set", "[+-][0-9]+\\.[0-9][0-9] dB"},
-        {"/EV-DO/Fingers", "[+-][0-9]+\\.[0-9][0-9] dB|.none."},
-        {"/EV-DO/UATI 24", "0x[0-9a-f]+"},
-        {"/EV-DO/Color Code", "0|4[127]"},
-        {"/Data Rates/Forward Link", rate},
-        {"/Data Rates/Reverse Link", rate},
+    const char* const oneXState = "[A-Z].* .[0-9]+.";
+    const char* const evdoState = "[A-Z][a-z]+ .[0-5].";
+    const char* const roaming = "OFF .0.|Flashing .2.";
+    const char* const system = "3200[12]|.unknown system type 0.";
+    const char* const network = "[12][12]|.unknown system type 0.";
+    // A call and a connection show both chains and the transmitters, which have no value otherwise.
+    const auto inCalls = [](const char* expression) {
+        return AllOf(changing(expression), Contains("N/A"), SizeIs(Ge(10U)));
     };
-    std::set<std::string> labels;
-    for (const auto& [label, seen] : texts) {
-        labels.insert(label);
-        ASSERT_TRUE(expected.contains(label)) << label;
-        std::set<std::string> distinct = seen;
-        distinct.erase("");
-        EXPECT_GE(distinct.size(), 2U) << label << " never changes";
-        for (const std::string& text : distinct)
-            EXPECT_THAT(text, MatchesRegex(expected.at(label))) << label;
-    }
-    EXPECT_EQ(labels.size(), expected.size());
-    // A call and a connection show both chains and the transmitters.
-    for (const char* label :
-         {"/1x/Tx AGC", "/1x/Second Receiver/Rx AGC", "/EV-DO/Rx AGC 1", "/EV-DO/Tx AGC"}) {
-        EXPECT_TRUE(texts[label].contains("N/A")) << label;
-        EXPECT_GE(texts[label].size(), 10U) << label;
-    }
-    double fastest = 0;
-    for (const std::string& text : texts["/Data Rates/Forward Link"])
-        if (!text.empty())
-            fastest = std::max(fastest, std::stod(text));
-    EXPECT_GE(fastest, 500);
-    EXPECT_LE(fastest, 2500);
+    const auto forwardRates =
+        AllOf(changing(rate), Each(IsNumber(0, 2500, " kbps")), Contains(IsNumber(500, 2500, " kbps")));
+    ExpectedDisplay display;
+    display.scenario = "c2k";
+    display.templateName = "C2KTemplate";
+    display.texts = {
+        {"/Overview/1x State", changing(oneXState)},
+        {"/Overview/EV-DO State", changing(evdoState)},
+        {"/Overview/Roaming Indicator", changing(roaming)},
+        {"/Overview/System ID", changing(system)},
+        {"/Overview/Network ID", changing(network)},
+        {"/Overview/Forward Link Rate", forwardRates},
+        {"/Overview/Reverse Link Rate", changing(rate)},
+        {"/System/System ID", changing(system)},
+        {"/System/Network ID", changing(network)},
+        {"/System/Base Station ID", changing("[0-9]+")},
+        {"/System/Packet Zone ID", changing("[0127]")},
+        {"/System/Roaming Indicator", changing(roaming)},
+        {"/System/Protocol Revision", changing("[06]")},
+        {"/1x/Device State", changing(oneXState)},
+        {"/1x/Band Class", changing(band)},
+        {"/1x/Channel", changing("0|283|375")},
+        {"/1x/Rx AGC", changing(fineLevel)},
+        {"/1x/Tx AGC", inCalls(fineLevel)},
+        {"/1x/Frame Error Rate", changing("[0-9]\\.[0-9][0-9]%|[0-9]\\.[0-9][0-9]% .old.")},
+        {"/1x/Active Set", changing("(.ref pilot. )?-[0-9]+\\.[0-9][0-9] dB")},
+        {"/1x/Second Receiver/Band Class", changing(std::string("N/A|") + band)},
+        {"/1x/Second Receiver/Channel", changing("N/A|283|375")},
+        {"/1x/Second Receiver/Rx AGC", inCalls(fineLevel)},
+        {"/EV-DO/Device State", changing(evdoState)},
+        {"/EV-DO/Session State", changing("[A-Z].* .[0-4].")},
+        {"/EV-DO/Band Class", changing(band)},
+        {"/EV-DO/Channel", changing("0|78|425")},
+        {"/EV-DO/Serving PN Offset", changing("Invalid Value|[0-9]+ \u00D7 64chips")},
+        {"/EV-DO/Rx AGC 0", changing(level)},
+        {"/EV-DO/Rx AGC 1", inCalls(level)},
+        {"/EV-DO/Tx AGC", inCalls(level)},
+        {"/EV-DO/Active Set", changing("[+-][0-9]+\\.[0-9][0-9] dB")},
+        {"/EV-DO/Fingers", changing("[+-][0-9]+\\.[0-9][0-9] dB|.none.")},
+        {"/EV-DO/UATI 24", changing("0x[0-9a-f]+")},
+        {"/EV-DO/Color Code", changing("0|4[127]")},
+        {"/Data Rates/Forward Link", forwardRates},
+        {"/Data Rates/Reverse Link", changing(rate)},
+    };
+    display.logLevel = LogPriority::Warning;
+    display.reports = {
+        {"Invalid log type: 2\\. Dropping\\.", Ge(5)},
+        {"Log code .*", AllOf(Ge(30), Le(90))},
+    };
+    display.isReported = isUnusual;
+    return display;
 }
 
-} // namespace
 } // namespace velmora
