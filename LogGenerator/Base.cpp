@@ -50,7 +50,8 @@ void Base::updateLogCodeDict(CodeDictionary& codeDict) {
 }
 
 void Base::updateWithData(const Data& data, std::uint32_t logCode) {
-    trace();
+    if (isLogged(LogPriority::Warning)) // saves most records a virtual call
+        trace();
     const View* const view = viewOf(logCode);
     if (!view) {
         unknownCode(logCode);
@@ -60,7 +61,7 @@ void Base::updateWithData(const Data& data, std::uint32_t logCode) {
     if (record.size() < view->minimumLength)
         return;
     check(*view, record);
-    keep(*view, record.part(0, neededLength(*view, record)), partsOf(*view, record));
+    keep(*view, record.part(0, std::min(view->readLength, record.size())), partsOf(*view, record));
 }
 
 void Base::decode(const View& view, const Record& record, FieldVisitor& visitor) const {
@@ -85,19 +86,8 @@ void Base::unknownCode(std::uint32_t logCode) const {
 
 void Base::check(const View&, const Record&) const {}
 
-std::size_t Base::neededLength(const View& view, const Record& record) const {
-    return view.table ? view.minimumLength : record.size();
-}
-
 KeptRecords::Parts Base::partsOf(const View&, const Record&) const {
     return 1;
-}
-
-const View* Base::viewOf(std::uint32_t logCode) const {
-    const std::span<const View> all = _views.empty() ? views() : _views;
-    const auto found =
-        std::find_if(all.begin(), all.end(), [logCode](const View& view) { return view.code == logCode; });
-    return found == all.end() ? nullptr : &*found;
 }
 
 bool Base::prepareFor(const View& view, KeptRecords::Parts parts) {

@@ -95,22 +95,19 @@ public:
 protected:
     Base() = default;
 
-    /// The log line of each record, decoded or not: the section's name at warning priority.
+    /// The log line of each record, decoded or not: the section's name at warning priority. It must not be
+    /// more urgent than that: where warnings are not logged, it is not called.
     virtual void trace() const;
     /// A record under a code that no view has: an error line.
     virtual void unknownCode(std::uint32_t logCode) const;
     /// Logs what an accepted record lacks, once, on arrival. The default logs nothing.
     virtual void check(const View& view, const Record& record) const;
-    /// How much of an accepted record `decode` reads; the rest is not kept. The default is what the
-    /// view's table reads, or all of it.
-    [[nodiscard]] virtual std::size_t neededLength(const View& view, const Record& record) const;
     /// The parts that `decode` names of this record, where records of the view differ in their labels (see
     /// KeptRecords). The default is that they do not.
     [[nodiscard]] virtual KeptRecords::Parts partsOf(const View& view, const Record& record) const;
 
-    /// Keeps what `decode` needs of a record, to be written into the node. Without a node it is dropped.
-    /// `store`, called before, may keep more than bytes in the section: what it replaces has been written
-    /// by then where it must be.
+    /// Keeps a record to be written into the node. Without a node it is dropped. `store`, called before, may
+    /// keep more than bytes in the section: what it replaces has been written by then where it must be.
     template <class Store>
     void keep(const View& view, const Record& record, KeptRecords::Parts parts, Store store) {
         if (prepareFor(view, parts)) {
@@ -123,7 +120,12 @@ protected:
     }
 
     /// The view of that code, or null.
-    [[nodiscard]] const View* viewOf(std::uint32_t logCode) const;
+    [[nodiscard]] const View* viewOf(std::uint32_t logCode) const {
+        for (const View& view : _views.empty() ? views() : _views)
+            if (view.code == logCode)
+                return &view;
+        return nullptr;
+    }
 
     /// "Record 0x5137: 2 of 3 entries", where the record holds fewer than its count announces.
     static void reportMissingEntries(const CountedList& list, std::uint32_t logCode);

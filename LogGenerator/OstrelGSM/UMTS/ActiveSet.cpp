@@ -31,10 +31,16 @@ constexpr Field energyPerChip{"Energy Per Chip",
 
 constexpr Content contents[] = {scramblingCode, codePower, energyPerChip};
 
+constexpr View sectionViews[] = {{SearcherRecord::code, SearcherRecord::minimumLength}};
+
 } // namespace
 
 std::span<const Content> ActiveSet::cellContents() const {
     return contents;
+}
+
+std::span<const View> ActiveSet::views() const {
+    return sectionViews;
 }
 
 void ActiveSet::checkCells(const Record& record) const {

@@ -13,7 +13,7 @@ using OstrelGSM::SearcherRecord;
 
 namespace {
 
-constexpr View sectionViews[] = {{SearcherRecord::code, SearcherRecord::minimumLength}};
+constexpr View sectionViews[] = {{SearcherRecord::code, SearcherRecord::minimumLength, 0}};
 constexpr std::string_view cellKeys[] = {"Scrambling Code"};
 constexpr List rows{.keys = cellKeys};
 
@@ -45,10 +45,6 @@ void SearcherSet::describe(const View&, ContentVisitor& visitor) const {
 
 void SearcherSet::checkCells(const Record& record) const {
     reportMissingEntries(SearcherRecord(record).cells(), SearcherRecord::code);
-}
-
-std::size_t SearcherSet::neededLength(const View&, const Record&) const {
-    return 0;
 }
 
 void SearcherSet::visitCells(const Record&, FieldVisitor&) const {}
