@@ -54,7 +54,7 @@ void LogGenerator::setObservationSink(ObservationSink* sink) {
 
 void LogGenerator::passObservations(std::optional<std::uint32_t> code,
                                     std::optional<std::uint64_t> timestamp) {
-    _sink->observed(_observer->message(code, timestamp));
+    _sink->observed(_observer->message(_clock.now(), code, timestamp));
 }
 
 Value LogGenerator::display(Dictionary& state) {

@@ -6,6 +6,7 @@
 #include "LogGenerator/Fields/Field.h"
 #include "LogGenerator/Observations/Catalogue.h"
 #include "Platform/Bytes.h"
+#include "Platform/Clock.h"
 
 #include <cstdint>
 #include <optional>
@@ -60,6 +61,8 @@ struct ObservedList {
 
 /// What a log message reported. Valid during the call that passes it.
 struct ObservedMessage {
+    std::uint64_t number; ///< of the message, from 1, of those that arrived since there is a sink
+    Time arrival;         ///< by the decoder's clock
     /// By which the record was routed, 0xFF0000 added for the extra stream; absent for a message that was
     /// dropped or is no record.
     std::optional<std::uint32_t> code;

@@ -66,6 +66,7 @@ Unit textUnit(const CatalogueField& leaf) {
 } // namespace
 
 void Observer::beginMessage() {
+    ++_messages;
     _map = nullptr;
     _sections.clear();
     _observations.clear();
@@ -87,9 +88,9 @@ bool Observer::beginSection(const FieldMap& map, std::uint32_t code) {
     return true;
 }
 
-ObservedMessage Observer::message(std::optional<std::uint32_t> code,
+ObservedMessage Observer::message(Time arrival, std::optional<std::uint32_t> code,
                                   std::optional<std::uint64_t> timestamp) const {
-    return {code, timestamp, _observations, _lists, _removed};
+    return {_messages, arrival, code, timestamp, _observations, _lists, _removed};
 }
 
 Observation& Observer::add(const CatalogueField& leaf, const CatalogueSource* source) {

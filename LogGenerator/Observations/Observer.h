@@ -29,8 +29,8 @@ public:
     /// The fields of a section follow, from a record of that code. False where the section has named that
     /// record's fields already: a code that is subscribed twice is observed once.
     [[nodiscard]] bool beginSection(const FieldMap& map, std::uint32_t code);
-    /// All of the message.
-    [[nodiscard]] ObservedMessage message(std::optional<std::uint32_t> code,
+    /// All of the message, as it arrived at that time.
+    [[nodiscard]] ObservedMessage message(Time arrival, std::optional<std::uint32_t> code,
                                           std::optional<std::uint64_t> timestamp) const;
 
     /// The leaves of a property list that is shown at the node.
@@ -72,6 +72,7 @@ private:
     void newRow(std::uint32_t number);
     void leaf(const CatalogueField& leaf, const Value& value);
 
+    std::uint64_t _messages = 0;
     const FieldMap* _map = nullptr;
     std::uint32_t _code = 0; ///< of the record whose fields are named
     std::vector<std::pair<const FieldMap*, std::uint32_t>> _sections; ///< of this message

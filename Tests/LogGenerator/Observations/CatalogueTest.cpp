@@ -109,7 +109,7 @@ TEST_F(CatalogueTest, AListOfTwoRecordsIsReplacedOnce) {
     observer.number(cellFields[0], 5);
     observer.endRow();
     observer.endList();
-    EXPECT_EQ(observer.message(std::nullopt, std::nullopt).lists.size(), 1u);
+    EXPECT_EQ(observer.message(Time(), std::nullopt, std::nullopt).lists.size(), 1u);
     // Its value comes from the record of that code, once.
     ASSERT_EQ(observations().size(), 1u);
     EXPECT_EQ(only().source->code, 0x4005u);

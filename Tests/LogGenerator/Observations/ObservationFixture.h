@@ -40,7 +40,7 @@ protected:
     }
 
     [[nodiscard]] std::span<const Observation> observations() const {
-        return observer.message(std::nullopt, std::nullopt).observations;
+        return observer.message(Time(), std::nullopt, std::nullopt).observations;
     }
     /// The only observation.
     [[nodiscard]] const Observation& only() const {

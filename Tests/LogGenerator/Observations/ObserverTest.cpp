@@ -33,7 +33,7 @@ class ObserverTest : public ObservationFixture {
 protected:
     [[nodiscard]] std::vector<std::string> lists() const {
         std::vector<std::string> texts;
-        for (const ObservedList& list : observer.message(std::nullopt, std::nullopt).lists)
+        for (const ObservedList& list : observer.message(Time(), std::nullopt, std::nullopt).lists)
             texts.push_back(list.list->path() + " " + std::to_string(list.rows));
         return texts;
     }
@@ -180,7 +180,7 @@ TEST_F(ObserverTest, ALabelThatIsRemovedIsReported) {
     begin(contents);
     observer.removed("Second");
     observer.removed("Third");
-    EXPECT_THAT(observer.message(std::nullopt, std::nullopt).removed, ElementsAre(&leaf("/Section/Second")));
+    EXPECT_THAT(observer.message(Time(), std::nullopt, std::nullopt).removed, ElementsAre(&leaf("/Section/Second")));
     EXPECT_THAT(observations(), IsEmpty());
 }
 

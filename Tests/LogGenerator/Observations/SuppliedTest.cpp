@@ -69,7 +69,7 @@ TEST_F(SuppliedTest, ATreeIsObservedLeafByLeaf) {
                                      "/Section/File/Networks/1/MNC [] 02"));
     EXPECT_EQ(observations()[2].leaf->path, "/Section/File/Networks/*/MNC");
     EXPECT_EQ(observations()[2].leaf->section, "Section");
-    const ObservedMessage message = observer.message(std::nullopt, std::nullopt);
+    const ObservedMessage message = observer.message(Time(), std::nullopt, std::nullopt);
     ASSERT_EQ(message.lists.size(), 1u);
     EXPECT_EQ(message.lists[0].list->path(), "/Section/File/Networks");
     EXPECT_EQ(message.lists[0].rows, 2u);
