@@ -124,10 +124,10 @@ _velmora_log() {
         fi
         return
         ;;
-    decode) options+=(--format --every --select --from --to --technology --jobs) ;;
+    decode) options+=(--format --every --select --from --to --technology --strict --jobs) ;;
     watch) options+=(--once) ;;
     record) options+=(--force --duration --count) ;;
-    convert) options+=(--force --technology --description) ;;
+    convert) options+=(--force --technology --description --strict) ;;
     info) options+=(--technology) ;;
     esac
     if [[ $cur == -* ]]; then

@@ -27,6 +27,11 @@ TEST(CommandLineTest, DecodeTakesFilesFormatAndTechnology) {
     EXPECT_THAT(decode->files, ElementsAre("a", "-", "b"));
     EXPECT_EQ(decode->format, DecodeOptions::Format::Json);
     EXPECT_EQ(decode->technology, "IFX");
+    EXPECT_FALSE(decode->isStrict);
+    const CommandLine strictLine = parse({"decode", "--strict", "a"});
+    const auto* strict = std::get_if<DecodeOptions>(&strictLine.command);
+    ASSERT_NE(strict, nullptr);
+    EXPECT_TRUE(strict->isStrict);
 }
 
 TEST(CommandLineTest, DecodeTakesWhatLinesAndPartsAreWanted) {
@@ -87,19 +92,21 @@ TEST(CommandLineTest, RecordTakesItsLimits) {
 }
 
 TEST(CommandLineTest, ConvertTakesWhatTheNewFileIsToBe) {
-    const CommandLine line =
-        parse({"convert", "-", "a.velmora", "--force", "--technology", "IFX", "--description", "gate 4"});
+    const CommandLine line = parse({"convert", "-", "a.velmora", "--force", "--technology", "IFX",
+                                    "--description", "gate 4", "--strict"});
     const auto* convert = std::get_if<ConvertOptions>(&line.command);
     ASSERT_NE(convert, nullptr);
     EXPECT_EQ(convert->file, "-");
     EXPECT_EQ(convert->out, "a.velmora");
     EXPECT_TRUE(convert->force);
+    EXPECT_TRUE(convert->isStrict);
     EXPECT_EQ(convert->technology, "IFX");
     EXPECT_EQ(convert->description, "gate 4");
     const CommandLine plainLine = parse({"convert", "a.dlf", "a.pcapng"});
     const auto* plain = std::get_if<ConvertOptions>(&plainLine.command);
     ASSERT_NE(plain, nullptr);
     EXPECT_FALSE(plain->force);
+    EXPECT_FALSE(plain->isStrict);
     EXPECT_EQ(plain->technology, "");
     EXPECT_EQ(plain->description, "");
 }

@@ -133,6 +133,7 @@ Result<bool> toSnapshot(MessageReader& reader, const Conversion& conversion, int
     SaveContents saved(conversion.refreshes);
     DecodingRequest request;
     request.technology = conversion.technology;
+    request.isStrict = conversion.isStrict;
     const Result<Decoded> decoded = decodeMessages(reader, request, context, saved);
     if (!decoded)
         return Failure{conversion.title + ": " + decoded.reason()};
@@ -147,7 +148,7 @@ Result<bool> toSnapshot(MessageReader& reader, const Conversion& conversion, int
     const Bytes content(reinterpret_cast<const std::uint8_t*>(list->data()), list->size());
     if (const Result<Done> written = writeAll(descriptor, content); !written)
         return Failure{conversion.name + ": " + written.reason()};
-    return true;
+    return decoded->undecoded.report(conversion.title);
 }
 
 } // namespace

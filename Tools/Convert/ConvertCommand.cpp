@@ -107,6 +107,7 @@ bool convert(const ConvertOptions& options, MessageReader& reader, const std::st
     conversion.name = options.out;
     conversion.technology = options.technology;
     conversion.description = options.description;
+    conversion.isStrict = options.isStrict;
     if (conversion.form == FileForm::Snapshot)
         conversion.refreshes = refreshesOf(options.file);
     const Result<bool> converted = convertMessages(reader, conversion, output->descriptor(), context);

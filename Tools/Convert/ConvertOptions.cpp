@@ -26,6 +26,9 @@ CLI::App* addConvert(CLI::App& app, ConvertOptions& options) {
     addTechnology(*command, options.technology, "Convert as");
     command->add_option("--description", options.description, "A snapshot's description; empty by default")
         ->type_name("TEXT");
+    command->add_flag("--strict", options.isStrict,
+                      "For a snapshot: end at a message that ends the application; by default it is counted, "
+                      "reported and left out");
     command->footer(
         "A recording holds all messages with their times, a DLF log all messages; a snapshot is the one\n"
         "that the application would have written after the last message: the last five displays with the\n"

@@ -20,6 +20,7 @@ struct ConvertOptions {
     bool force = false;      ///< replace an existing file
     std::string technology;  ///< overrides the file's; empty for the file's
     std::string description; ///< a snapshot's
+    bool isStrict = false;   ///< for a snapshot: see DecodeOptions
 };
 
 /// Adds the command with its options, help and examples. Parsing fills `options`, which must outlive `app`.

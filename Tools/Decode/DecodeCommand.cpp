@@ -83,16 +83,17 @@ bool decodeFile(std::size_t index, const DecodeOptions& options, bool showsProgr
         clearProgress();
         writer->flush();
     });
-    const Result<Decoded> decoded =
-        decodeMessages(**reader, {options.technology, options.range, progress ? progress->get() : nullptr},
-                       context, *writer);
+    const Result<Decoded> decoded = decodeMessages(
+        **reader, {options.technology, options.range, progress ? progress->get() : nullptr, options.isStrict},
+        context, *writer);
     clearProgress();
     if (decoded)
         writer->finish(*decoded);
     else
         report(title + ": " + decoded.reason());
+    const bool allDecoded = decoded && decoded->undecoded.report(title);
     const bool whole = reportLosses(**reader, title);
-    return decoded && whole;
+    return allDecoded && whole;
 }
 
 } // namespace

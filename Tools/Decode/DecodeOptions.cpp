@@ -89,6 +89,9 @@ CLI::App* addDecode(CLI::App& app, DecodeOptions& options) {
     addBound(*command, "--from", options.range.from, "Only messages at or after this time");
     addBound(*command, "--to", options.range.to, "Only messages before this time");
     addTechnology(*command, options.technology, "Decode as");
+    command->add_flag("--strict", options.isStrict,
+                      "End at a message that ends the application; by default it is counted, reported and "
+                      "left out");
     command->add_option("--jobs", options.jobs, "Decode this many files in parallel")
         ->check(positiveCount())
         ->type_name("N");

@@ -31,6 +31,7 @@ struct DecodeOptions {
     NodeSelection selection;      ///< not empty for Csv; empty for JsonLines with `Message`
     TimeRange range;
     std::string technology; ///< overrides the file's; empty for the file's
+    bool isStrict = false;  ///< a message that ends the application ends decoding as well
     std::size_t jobs = 1;   ///< how many files are decoded in parallel
     std::vector<std::string> files;
 };

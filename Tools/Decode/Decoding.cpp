@@ -3,6 +3,8 @@
 
 #include "Tools/Decode/Decoding.h"
 
+#include "LogGenerator/Extra/ExtraPayload.h"
+#include "LogGenerator/GSM/AssertionFailure.h"
 #include "Platform/TelephonyService.h"
 #include "Tools/Decode/DecodeProgress.h"
 #include "Tools/Decode/RefreshTicks.h"
@@ -15,6 +17,23 @@
 #include <utility>
 
 namespace velmora {
+
+namespace {
+
+/// Calls `decode`. Where the message is one that ends the application, returns why.
+template <class Decode>
+std::optional<std::string> reasonNotDecoded(const Decode& decode) {
+    try {
+        decode();
+        return std::nullopt;
+    } catch (const LogCode_0xFF0000::UnknownDataException& failure) {
+        return failure.what();
+    } catch (const AssertionFailure& failure) {
+        return failure.what();
+    }
+}
+
+} // namespace
 
 Result<Decoded> decodeMessages(MessageReader& reader, const DecodingRequest& request, WorkContext& context,
                                DecodingObserver& observer) {
@@ -63,12 +82,22 @@ Result<Decoded> decodeMessages(MessageReader& reader, const DecodingRequest& req
         context.atRecord(logged.number, logged.offset);
         clock.setNow(logged.time);
         observer.willDecode(logged);
-        if (effects)
-            (*decoder)->updateStateReporting(state, logged.message, *effects);
+        const auto update = [&] {
+            if (effects)
+                (*decoder)->updateStateReporting(state, logged.message, *effects);
+            else
+                (*decoder)->updateState(state, logged.message);
+        };
+        std::optional<std::string> reason;
+        if (request.isStrict)
+            update();
         else
-            (*decoder)->updateState(state, logged.message);
+            reason = reasonNotDecoded(update);
         ++decoded.messages;
-        observer.didDecode(logged, **decoder, state);
+        if (reason)
+            decoded.undecoded.add(logged, *reason);
+        else
+            observer.didDecode(logged, **decoder, state);
         if (const std::optional<Time> tick = refreshes.after(logged))
             refresh(*tick);
     };

@@ -10,6 +10,7 @@
 #include "PropertyLists/Value.h"
 #include "Recording/MessageReader.h"
 #include "Tools/Decode/TimeRange.h"
+#include "Tools/Decode/UndecodedMessages.h"
 
 #include <cstdint>
 #include <string>
@@ -21,10 +22,11 @@ class WorkContext;
 
 /// The result of decoding a file.
 struct Decoded {
-    std::string technology; ///< the short name
-    std::uint64_t messages = 0;
+    std::string technology;     ///< the short name
+    std::uint64_t messages = 0; ///< dropped and undecoded ones included
     std::uint64_t refreshes = 0;
     Value display; ///< after the latest refresh; none if there was none
+    UndecodedMessages undecoded;
 };
 
 /// Gets decoding's events as they happen. Displays and the state belong to the decoder: they change with the
@@ -43,7 +45,8 @@ public:
     /// Whether the display is needed at each refresh, or only at the last one; called once. Decoding without
     /// is faster, since only the requested displays are written.
     [[nodiscard]] virtual bool wantsEveryRefresh() const { return true; }
-    /// A message in the range has been decoded; `decoder.display(state)` is the display after it.
+    /// A message in the range has been decoded; `decoder.display(state)` is the display after it. Not called
+    /// for a message that could not be decoded.
     virtual void didDecode(const LoggedMessage&, LogGenerator& /*decoder*/, Dictionary& /*state*/) {}
     /// Called after a refresh; `decoded` holds the display and the result so far.
     virtual void didRefresh(Time /*tick*/, const Decoded& /*decoded*/) {}
@@ -58,11 +61,15 @@ struct DecodingRequest {
     TimeRange range;        ///< messages outside are skipped
     DecodeProgress* progress =
         nullptr; ///< gets the offset of every message, in the range or not; may be null
+    /// A message that ends the application ends the program here as well.
+    bool isStrict = false;
 };
 
 /// Runs a file's messages through the decoder of its technology, and refreshes as the application does while
-/// they arrive. `context` gets each record's number. Fails before anything is decoded when there is no
-/// decoder, and afterwards when the decoder had no template; exceptions of the decoders pass through.
+/// they arrive. `context` gets each record's number. A message that ends the application by an exception
+/// (UnknownDataException, AssertionFailure) changes nothing in the state, is counted and left out; where the
+/// request is strict, the exception passes through, as others always do. Fails before anything is decoded
+/// when there is no decoder, and afterwards when the decoder had no template.
 [[nodiscard]] Result<Decoded> decodeMessages(MessageReader& reader, const DecodingRequest& request,
                                              WorkContext& context, DecodingObserver& observer);
 

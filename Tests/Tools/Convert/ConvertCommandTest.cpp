@@ -251,10 +251,31 @@ TEST_F(ConvertCommandTest, TechnologyIsTheUsersBeforeTheFiles) {
 TEST_F(ConvertCommandTest, MessageThatEndsADecoderLeavesWhatWasThere) {
     writeRecording("ifx.pcapng", "IFX", {{at(0), hex("01 02 03")}});
     std::ofstream(path("out/ifx.velmora")) << "an earlier one";
-    EXPECT_THAT(convert({"--force", path("ifx.pcapng"), path("out/ifx.velmora")}, 1),
+    EXPECT_THAT(convert({"--strict", "--force", path("ifx.pcapng"), path("out/ifx.velmora")}, 1),
                 HasSubstr("Could not deserialize the object"));
     EXPECT_EQ(contentOf("out/ifx.velmora"), "an earlier one");
     EXPECT_THAT(outputs(), ElementsAre("ifx.velmora"));
+}
+
+TEST_F(ConvertCommandTest, SnapshotLeavesOutWhatCannotBeDecoded) {
+    const Data unreadable = record(0x0000, "DE AD BE EF", 0xFF);
+    const auto offsets = writeRecording("sim.pcapng", "Ostrel_GSM",
+                                        {{at(0), rrState(4)}, {at(500), unreadable}, {at(4100), unreadable}});
+    const auto place = [&](int number) {
+        return "velmora-log: " + path("sim.pcapng") + ": record " + std::to_string(number) + " at offset " +
+               std::to_string(offsets[number - 1]) + ": SIM File dictionary data could not be constructed\n";
+    };
+    EXPECT_EQ(convert({path("sim.pcapng"), path("out/sim.velmora")}, 1),
+              place(2) + place(3) + "velmora-log: " + path("sim.pcapng") +
+                  ": 2 messages could not be decoded\n");
+    const Value list = snapshot("out/sim.velmora");
+    ASSERT_NE(list.asDictionary(), nullptr);
+    // As the application refreshes whenever a message has arrived: at 2 s, and at 6 s with nothing new.
+    EXPECT_EQ((*list.asDictionary())["Timestamp"], Value("2026-11-16 05:00:06 +0000"));
+    const Array& data = *(*list.asDictionary())["Data"].asArray();
+    ASSERT_EQ(data.size(), 3U);
+    EXPECT_EQ((*data[0].asDictionary())["DisplayState"], Value(rrState(4)));
+    EXPECT_EQ((*data[1].asDictionary())["DisplayState"], Value(Data()));
 }
 
 TEST_F(ConvertCommandTest, FailureToWriteLeavesWhatWasThere) {
