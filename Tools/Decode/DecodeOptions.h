@@ -4,7 +4,7 @@
 #pragma once
 
 #include "Tools/Decode/NodeSelection.h"
-#include "Tools/Decode/TimeRange.h"
+#include "Tools/Messages/TimeRange.h"
 
 #include <cstddef>
 #include <string>

@@ -9,8 +9,8 @@
 #include "Platform/Result.h"
 #include "PropertyLists/Value.h"
 #include "Recording/MessageReader.h"
-#include "Tools/Decode/TimeRange.h"
 #include "Tools/Decode/UndecodedMessages.h"
+#include "Tools/Messages/TimeRange.h"
 
 #include <cstdint>
 #include <string>
