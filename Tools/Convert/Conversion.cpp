@@ -25,23 +25,31 @@ namespace velmora {
 
 namespace {
 
-/// A file's messages, the first of which has been read: a file may name its technology no earlier than there.
+/// The selected messages of a file, the first of which has been read: a file may name its technology no
+/// earlier than there.
 struct Messages {
     MessageReader& reader;
+    MessageFilter filter;
     std::optional<LoggedMessage> next;
     std::string technology; ///< the short name
 
-    void advance() { next = reader.next(); }
+    void advance() {
+        do
+            next = reader.next();
+        while (next && !filter.passes(*next));
+    }
 };
 
 Result<Messages> begin(MessageReader& reader, const Conversion& conversion) {
-    std::optional<LoggedMessage> first = reader.next();
+    Messages messages{reader, MessageFilter(conversion.messages), {}, {}};
+    messages.advance();
     const std::string& named = conversion.technology.empty() ? reader.technology() : conversion.technology;
     const Result<std::string> technology = technologyNamed(named);
     if (!technology)
         return Failure{conversion.title + ": " + technology.reason() +
                        (named.empty() ? "; --technology supplies it" : "")};
-    return Messages{reader, std::move(first), std::string(shortTechnologyName(*technology))};
+    messages.technology = shortTechnologyName(*technology);
+    return messages;
 }
 
 /// A second descriptor of the file, for a writer that closes its descriptor.
@@ -133,6 +141,7 @@ Result<bool> toSnapshot(MessageReader& reader, const Conversion& conversion, int
     SaveContents saved(conversion.refreshes);
     DecodingRequest request;
     request.technology = conversion.technology;
+    request.messages = conversion.messages;
     request.isStrict = conversion.isStrict;
     const Result<Decoded> decoded = decodeMessages(reader, request, context, saved);
     if (!decoded)

@@ -78,12 +78,12 @@ std::string whyRefused(const ConvertOptions& options) {
 }
 
 /// How many refreshes the file takes; none where it is no regular file, which can be read but once.
-std::optional<std::uint64_t> refreshesOf(const std::string& file) {
+std::optional<std::uint64_t> refreshesOf(const std::string& file, const MessageSelection& messages) {
     struct stat status = {};
     if (file == "-" || ::stat(file.c_str(), &status) != 0 || !S_ISREG(status.st_mode))
         return std::nullopt;
     const Result<std::unique_ptr<MessageReader>> reader = openMessages(file);
-    return reader ? std::optional(countRefreshes(**reader)) : std::nullopt;
+    return reader ? std::optional(countRefreshes(**reader, messages)) : std::nullopt;
 }
 
 /// Whether all of the input is in the output now.
@@ -106,10 +106,11 @@ bool convert(const ConvertOptions& options, MessageReader& reader, const std::st
     conversion.title = title;
     conversion.name = options.out;
     conversion.technology = options.technology;
+    conversion.messages = options.messages;
     conversion.description = options.description;
     conversion.isStrict = options.isStrict;
     if (conversion.form == FileForm::Snapshot)
-        conversion.refreshes = refreshesOf(options.file);
+        conversion.refreshes = refreshesOf(options.file, options.messages);
     const Result<bool> converted = convertMessages(reader, conversion, output->descriptor(), context);
     if (!converted) {
         report(converted.reason());

@@ -84,7 +84,8 @@ bool decodeFile(std::size_t index, const DecodeOptions& options, bool showsProgr
         writer->flush();
     });
     const Result<Decoded> decoded = decodeMessages(
-        **reader, {options.technology, options.range, progress ? progress->get() : nullptr, options.isStrict},
+        **reader,
+        {options.technology, options.messages, progress ? progress->get() : nullptr, options.isStrict},
         context, *writer);
     clearProgress();
     if (decoded)

@@ -4,31 +4,11 @@
 #include "Tools/Decode/DecodeOptions.h"
 
 #include "Tools/CommandOptions.h"
-
-#include <optional>
+#include "Tools/Messages/SelectionOptions.h"
 
 namespace velmora {
 
 namespace {
-
-void addBound(CLI::App& command, const std::string& name, std::optional<TimeBound>& bound,
-              const std::string& description) {
-    command
-        .add_option_function<std::string>(
-            name,
-            [&bound](const std::string& text) {
-                if (const Result<TimeBound> read = readTimeBound(text))
-                    bound = *read;
-            },
-            description)
-        ->check(CLI::Validator(
-            [](const std::string& text) {
-                const Result<TimeBound> read = readTimeBound(text);
-                return read ? std::string() : read.reason();
-            },
-            ""))
-        ->type_name("TIME");
-}
 
 /// Refuses options that make no sense together.
 void checkTogether(const DecodeOptions& options) {
@@ -86,8 +66,8 @@ CLI::App* addDecode(CLI::App& app, DecodeOptions& options) {
         ->allow_extra_args(false) // a FILE may follow
         ->multi_option_policy(CLI::MultiOptionPolicy::TakeAll)
         ->type_name("PATH");
-    addBound(*command, "--from", options.range.from, "Only messages at or after this time");
-    addBound(*command, "--to", options.range.to, "Only messages before this time");
+    addSelection(*command, options.messages,
+                 "; decoding starts cold: what the others leave in the display is missing");
     addTechnology(*command, options.technology, "Decode as");
     command->add_flag("--strict", options.isStrict,
                       "End at a message that ends the application; by default it is counted, reported and "
@@ -98,10 +78,9 @@ CLI::App* addDecode(CLI::App& app, DecodeOptions& options) {
     command->footer(
         "With several files, text has the files' names as headings, json is one object after another,\n"
         "and jsonl and csv have the \"file\" in each line. All JSON conforms to velmora-log.schema.json.\n"
-        "A csv cell without a value is empty.\n\n"
-        "A TIME is ISO 8601 (UTC unless it has a zone), seconds since 1970, or +SECONDS after the file's\n"
-        "first message.\n\n"
-        "Examples:\n"
+        "A csv cell without a value is empty.\n\n" +
+        std::string(timeHelp) +
+        "\nExamples:\n"
         "  velmora-log decode drive.pcapng\n"
         "  velmora-log decode --format json drive.pcapng | jq .display\n"
         "  velmora-log decode --format jsonl --every message --from +60 --to +120 drive.pcapng\n"

@@ -4,7 +4,7 @@
 #pragma once
 
 #include "Tools/Decode/NodeSelection.h"
-#include "Tools/Messages/TimeRange.h"
+#include "Tools/Messages/MessageSelection.h"
 
 #include <cstddef>
 #include <string>
@@ -29,7 +29,7 @@ struct DecodeOptions {
     Format format = Format::Text;
     Every every = Every::Refresh; ///< `Message` for JsonLines and Csv alone
     NodeSelection selection;      ///< not empty for Csv; empty for JsonLines with `Message`
-    TimeRange range;
+    MessageSelection messages;
     std::string technology; ///< overrides the file's; empty for the file's
     bool isStrict = false;  ///< a message that ends the application ends decoding as well
     std::size_t jobs = 1;   ///< how many files are decoded in parallel

@@ -68,11 +68,11 @@ Result<Decoded> decodeMessages(MessageReader& reader, const DecodingRequest& req
         }
     };
     MessageEffects* const effects = observer.effects();
-    const Time first = message ? message->time : Time();
+    MessageFilter filter(request.messages);
     const auto decode = [&](const LoggedMessage& logged) {
         if (request.progress)
             request.progress->at(logged.offset);
-        if (!request.range.contains(logged.time, first)) {
+        if (!filter.passes(logged)) {
             if (const std::optional<Time> tick = refreshes.afterSkipped(logged))
                 refresh(*tick);
             return;

@@ -10,7 +10,7 @@
 #include "PropertyLists/Value.h"
 #include "Recording/MessageReader.h"
 #include "Tools/Decode/UndecodedMessages.h"
-#include "Tools/Messages/TimeRange.h"
+#include "Tools/Messages/MessageSelection.h"
 
 #include <cstdint>
 #include <string>
@@ -35,7 +35,7 @@ class DecodingObserver {
 public:
     virtual ~DecodingObserver() = default;
 
-    /// Called before a message in the range is decoded.
+    /// Called before a selected message is decoded.
     virtual void willDecode(const LoggedMessage&) {}
     /// The observer of each message's effects; called once. Null for none, which makes decoding faster.
     [[nodiscard]] virtual MessageEffects* effects() { return nullptr; }
@@ -45,7 +45,7 @@ public:
     /// Whether the display is needed at each refresh, or only at the last one; called once. Decoding without
     /// is faster, since only the requested displays are written.
     [[nodiscard]] virtual bool wantsEveryRefresh() const { return true; }
-    /// A message in the range has been decoded; `decoder.display(state)` is the display after it. Not called
+    /// A selected message has been decoded; `decoder.display(state)` is the display after it. Not called
     /// for a message that could not be decoded.
     virtual void didDecode(const LoggedMessage&, LogGenerator& /*decoder*/, Dictionary& /*state*/) {}
     /// Called after a refresh; `decoded` holds the display and the result so far.
@@ -57,10 +57,9 @@ public:
 };
 
 struct DecodingRequest {
-    std::string technology; ///< overrides the file's; empty for the file's
-    TimeRange range;        ///< messages outside are skipped
-    DecodeProgress* progress =
-        nullptr; ///< gets the offset of every message, in the range or not; may be null
+    std::string technology;             ///< overrides the file's; empty for the file's
+    MessageSelection messages;          ///< others are skipped
+    DecodeProgress* progress = nullptr; ///< gets the offset of every message, selected or not; may be null
     /// A message that ends the application ends the program here as well.
     bool isStrict = false;
 };

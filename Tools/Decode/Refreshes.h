@@ -6,6 +6,7 @@
 #include "Platform/Clock.h"
 #include "Recording/MessageReader.h"
 #include "Tools/Decode/RefreshTicks.h"
+#include "Tools/Messages/MessageSelection.h"
 
 #include <cstdint>
 #include <optional>
@@ -49,7 +50,7 @@ private:
     std::uint64_t _count = 0;
 };
 
-/// How many refreshes decoding all messages takes, from the reader's position to its end.
-[[nodiscard]] std::uint64_t countRefreshes(MessageReader& reader);
+/// How many refreshes decoding the selected messages of a file takes, of which nothing has been read.
+[[nodiscard]] std::uint64_t countRefreshes(MessageReader& reader, const MessageSelection& messages);
 
 } // namespace velmora

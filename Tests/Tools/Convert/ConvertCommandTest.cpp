@@ -2,9 +2,8 @@
 // SPDX-License-Identifier: MIT
 
 #include "Platform/Linux/LoopTimer.h"
-#include "PropertyLists/PropertyList.h"
 #include "Recording/OpenMessages.h"
-#include "Tests/Tools/ToolFixture.h"
+#include "Tests/Tools/Convert/ConvertFixture.h"
 
 #include <gmock/gmock.h>
 
@@ -22,53 +21,7 @@ namespace {
 using testing::ElementsAre;
 using testing::HasSubstr;
 
-class ConvertCommandTest : public ToolTest {
-protected:
-    ConvertCommandTest() {
-        writeRecording("drive.pcapng", "Ostrel_GSM", _drive);
-        std::filesystem::create_directory(path("out"));
-    }
-
-    /// Runs `velmora-log convert` and returns its messages; checks its exit status.
-    std::string convert(std::vector<std::string> arguments, int status,
-                        std::optional<std::string> input = std::nullopt) {
-        arguments.insert(arguments.begin(), "convert");
-        ToolProcess::Setup setup = tool(std::move(arguments));
-        setup.input = std::move(input);
-        ToolProcess process(setup);
-        EXPECT_EQ(process.exitStatus(), status) << process.errors();
-        EXPECT_EQ(process.output(), "");
-        return ownMessages(process.errors());
-    }
-    /// What is in the directory that the tests write to.
-    [[nodiscard]] std::vector<std::string> outputs() const {
-        std::vector<std::string> names;
-        for (const auto& entry : std::filesystem::directory_iterator(_directory / "out"))
-            names.push_back(entry.path().filename().string());
-        return names;
-    }
-    [[nodiscard]] std::vector<Data> messagesOf(const std::string& name) const {
-        std::vector<Data> messages;
-        const auto reader = openMessages(path(name));
-        if (!reader) {
-            ADD_FAILURE() << reader.reason();
-            return messages;
-        }
-        while (const auto message = (*reader)->next())
-            messages.push_back(Data::copyOf(message->message.bytes()));
-        EXPECT_EQ((*reader)->lossTotals().losses, 0U);
-        return messages;
-    }
-    [[nodiscard]] Value snapshot(const std::string& name) const {
-        const std::string text = contentOf(name);
-        const auto list =
-            readPropertyList(Bytes(reinterpret_cast<const std::uint8_t*>(text.data()), text.size()));
-        return list ? *list : Value();
-    }
-
-    const std::vector<TimedMessage> _drive = {
-        {at(0), rrState(4)}, {at(500), record(0x4125, "03")}, {at(4100), rrState(5)}};
-};
+class ConvertCommandTest : public ConvertTest {};
 
 TEST_F(ConvertCommandTest, RecordingIsMadeTheSameAgain) {
     EXPECT_EQ(convert({path("drive.pcapng"), path("out/copy.pcapng")}, 0), "");
@@ -255,27 +208,6 @@ TEST_F(ConvertCommandTest, MessageThatEndsADecoderLeavesWhatWasThere) {
                 HasSubstr("Could not deserialize the object"));
     EXPECT_EQ(contentOf("out/ifx.velmora"), "an earlier one");
     EXPECT_THAT(outputs(), ElementsAre("ifx.velmora"));
-}
-
-TEST_F(ConvertCommandTest, SnapshotLeavesOutWhatCannotBeDecoded) {
-    const Data unreadable = record(0x0000, "DE AD BE EF", 0xFF);
-    const auto offsets = writeRecording("sim.pcapng", "Ostrel_GSM",
-                                        {{at(0), rrState(4)}, {at(500), unreadable}, {at(4100), unreadable}});
-    const auto place = [&](int number) {
-        return "velmora-log: " + path("sim.pcapng") + ": record " + std::to_string(number) + " at offset " +
-               std::to_string(offsets[number - 1]) + ": SIM File dictionary data could not be constructed\n";
-    };
-    EXPECT_EQ(convert({path("sim.pcapng"), path("out/sim.velmora")}, 1),
-              place(2) + place(3) + "velmora-log: " + path("sim.pcapng") +
-                  ": 2 messages could not be decoded\n");
-    const Value list = snapshot("out/sim.velmora");
-    ASSERT_NE(list.asDictionary(), nullptr);
-    // As the application refreshes whenever a message has arrived: at 2 s, and at 6 s with nothing new.
-    EXPECT_EQ((*list.asDictionary())["Timestamp"], Value("2026-11-16 05:00:06 +0000"));
-    const Array& data = *(*list.asDictionary())["Data"].asArray();
-    ASSERT_EQ(data.size(), 3U);
-    EXPECT_EQ((*data[0].asDictionary())["DisplayState"], Value(rrState(4)));
-    EXPECT_EQ((*data[1].asDictionary())["DisplayState"], Value(Data()));
 }
 
 TEST_F(ConvertCommandTest, FailureToWriteLeavesWhatWasThere) {
