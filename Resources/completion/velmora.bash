@@ -124,7 +124,7 @@ _velmora_log() {
         fi
         return
         ;;
-    decode) options+=(--format --every --select --from --to --code --technology --strict --jobs) ;;
+    decode) options+=(--format --every --select --from --to --code --warm --technology --strict --jobs) ;;
     watch) options+=(--once) ;;
     record) options+=(--force --duration --count) ;;
     convert) options+=(--force --from --to --code --technology --description --strict) ;;

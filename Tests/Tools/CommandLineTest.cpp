@@ -35,9 +35,10 @@ TEST(CommandLineTest, DecodeTakesFilesFormatAndTechnology) {
 }
 
 TEST(CommandLineTest, DecodeTakesWhatLinesAndPartsAreWanted) {
-    const CommandLine line = parse({"decode", "--select", "/A/B", "--format", "csv", "--every", "message",
-                                    "a", "--select=/C", "--jobs", "3", "--from", "+1.5", "--to",
-                                    "1970-01-01T00:01:00Z", "--code", "0x512C", "--code=5", "b"});
+    const CommandLine line = parse({"decode",  "--select", "/A/B",     "--format",    "csv",
+                                    "--every", "message",  "a",        "--select=/C", "--jobs",
+                                    "3",       "--from",   "+1.5",     "--to",        "1970-01-01T00:01:00Z",
+                                    "--code",  "0x512C",   "--code=5", "--warm",      "b"});
     const auto* decode = std::get_if<DecodeOptions>(&line.command);
     ASSERT_NE(decode, nullptr);
     EXPECT_THAT(decode->files, ElementsAre("a", "b"));
@@ -48,6 +49,7 @@ TEST(CommandLineTest, DecodeTakesWhatLinesAndPartsAreWanted) {
     EXPECT_EQ(decode->messages.range.from, (TimeBound{std::chrono::milliseconds(1500), true}));
     EXPECT_EQ(decode->messages.range.to, (TimeBound{std::chrono::minutes(1), false}));
     EXPECT_THAT(decode->messages.codes, ElementsAre(0x512C, 5));
+    EXPECT_TRUE(decode->messages.isWarm);
     const CommandLine lines = parse({"decode", "--format", "jsonl", "a"});
     const auto* plain = std::get_if<DecodeOptions>(&lines.command);
     ASSERT_NE(plain, nullptr);
@@ -57,6 +59,7 @@ TEST(CommandLineTest, DecodeTakesWhatLinesAndPartsAreWanted) {
     EXPECT_EQ(plain->jobs, 1U);
     EXPECT_FALSE(plain->messages.range.from || plain->messages.range.to);
     EXPECT_THAT(plain->messages.codes, testing::IsEmpty());
+    EXPECT_FALSE(plain->messages.isWarm);
 }
 
 TEST(CommandLineTest, WithoutOptionsLogLinesOfErrorsGoToStandardError) {
@@ -144,6 +147,7 @@ TEST(CommandLineTest, UsageErrorsGiveTheFoundAndTheExpectedValue) {
         {{"decode", "--to", "-1", "a"},
          "--to: got -1, wanted a time such as 2026-11-16T05:00:00Z, seconds since 1970, or +SECONDS after "
          "the first message"},
+        {{"decode", "--warm", "a"}, "--warm: got no --from, wanted the time from which on to write"},
         {{"decode", "--code", "512C", "a"}, "--code: got 512C, wanted a log code such as 0x512C or 0xFF0000"},
         {{"convert", "--from", "noon", "a", "b.dlf"},
          "--from: got noon, wanted a time such as 2026-11-16T05:00:00Z, seconds since 1970, or +SECONDS "

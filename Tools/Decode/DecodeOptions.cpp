@@ -15,6 +15,8 @@ void checkTogether(const DecodeOptions& options) {
     using Format = DecodeOptions::Format;
     const bool hasSelection = !options.selection.paths().empty();
     const bool everyMessage = options.every == DecodeOptions::Every::Message;
+    if (options.messages.isWarm && !options.messages.range.from)
+        throw CLI::ValidationError("--warm", "got no --from, wanted the time from which on to write");
     if (options.format == Format::Csv && !hasSelection)
         throw CLI::ValidationError("--format csv", "got no --select, wanted one for each column");
     if (everyMessage && options.format != Format::JsonLines && options.format != Format::Csv)
@@ -68,6 +70,9 @@ CLI::App* addDecode(CLI::App& app, DecodeOptions& options) {
         ->type_name("PATH");
     addSelection(*command, options.messages,
                  "; decoding starts cold: what the others leave in the display is missing");
+    command->add_flag("--warm", options.messages.isWarm,
+                      "With --from: decode from the beginning, and write from that time on what decoding "
+                      "without --from would write");
     addTechnology(*command, options.technology, "Decode as");
     command->add_flag("--strict", options.isStrict,
                       "End at a message that ends the application; by default it is counted, reported and "
@@ -85,6 +90,7 @@ CLI::App* addDecode(CLI::App& app, DecodeOptions& options) {
         "  velmora-log decode --format json drive.pcapng | jq .display\n"
         "  velmora-log decode --format jsonl --every message --from +60 --to +120 drive.pcapng\n"
         "  velmora-log decode --format csv --select '/GSM/GSM Serving Cell/RSSI' drive.pcapng > rssi.csv\n"
+        "  velmora-log decode --warm --from 2026-11-16T05:00:00Z --format jsonl drive.pcapng\n"
         "  velmora-log decode --from 2026-11-16T05:00:00Z --select /GSM drive.pcapng\n"
         "  velmora-log decode --format jsonl --jobs 4 monday/*.pcapng > monday.jsonl\n"
         "  velmora-log decode --technology Ostrel_GSM - < drive.pcapng");

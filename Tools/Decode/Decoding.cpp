@@ -53,22 +53,24 @@ Result<Decoded> decodeMessages(MessageReader& reader, const DecodingRequest& req
     Decoded decoded;
     decoded.technology = shortTechnologyName(named);
     Dictionary state;
+    MessageFilter filter(request.messages);
     Refreshes refreshes;
     const auto refresh = [&](Time tick) {
         refreshes.done();
         decoded.refreshes = refreshes.count();
         clock.setNow(tick);
+        const bool writes = filter.writes(tick);
         // A refresh without a reader is skipped, unless there is no display yet: then it logs the reason.
-        if (keepsHistory || wantsEveryRefresh || !state.contains("Display"))
+        if (keepsHistory || (wantsEveryRefresh && writes) || !state.contains("Display"))
             decoded.display = (*decoder)->generateLogUsingState(state);
-        observer.didRefresh(tick, decoded);
+        if (writes)
+            observer.didRefresh(tick, decoded);
         if (observer.wantsHistory(refreshes.count()) != keepsHistory) {
             keepsHistory = !keepsHistory;
             (*decoder)->setKeepsHistory(keepsHistory);
         }
     };
     MessageEffects* const effects = observer.effects();
-    MessageFilter filter(request.messages);
     const auto decode = [&](const LoggedMessage& logged) {
         if (request.progress)
             request.progress->at(logged.offset);
@@ -81,9 +83,11 @@ Result<Decoded> decodeMessages(MessageReader& reader, const DecodingRequest& req
             refresh(*tick);
         context.atRecord(logged.number, logged.offset);
         clock.setNow(logged.time);
-        observer.willDecode(logged);
+        const bool writes = filter.writes(logged.time);
+        if (writes)
+            observer.willDecode(logged);
         const auto update = [&] {
-            if (effects)
+            if (effects && writes)
                 (*decoder)->updateStateReporting(state, logged.message, *effects);
             else
                 (*decoder)->updateState(state, logged.message);
@@ -96,7 +100,7 @@ Result<Decoded> decodeMessages(MessageReader& reader, const DecodingRequest& req
         ++decoded.messages;
         if (reason)
             decoded.undecoded.add(logged, *reason);
-        else
+        else if (writes)
             observer.didDecode(logged, **decoder, state);
         if (const std::optional<Time> tick = refreshes.after(logged))
             refresh(*tick);
@@ -114,7 +118,7 @@ Result<Decoded> decodeMessages(MessageReader& reader, const DecodingRequest& req
     }
     if (const std::optional<Time> tick = refreshes.last())
         refresh(*tick);
-    if (refreshes.count() != 0 && !keepsHistory && !wantsEveryRefresh)
+    if (refreshes.count() != 0 && !keepsHistory)
         decoded.display = (*decoder)->display(state);
     observer.didFinish(**decoder, state);
     if (!resources.failure().empty())

@@ -50,7 +50,7 @@ public:
     virtual void didDecode(const LoggedMessage&, LogGenerator& /*decoder*/, Dictionary& /*state*/) {}
     /// Called after a refresh; `decoded` holds the display and the result so far.
     virtual void didRefresh(Time /*tick*/, const Decoded& /*decoded*/) {}
-    /// Called after the last refresh, with the final state.
+    /// Called after the last refresh, with the final state, whether or not that refresh is to be written.
     virtual void didFinish(const LogGenerator& /*decoder*/, const Dictionary& /*state*/) {}
     /// Whether decoding may stop here; called after every message.
     [[nodiscard]] virtual bool isDone() const { return false; }
@@ -58,7 +58,7 @@ public:
 
 struct DecodingRequest {
     std::string technology;             ///< overrides the file's; empty for the file's
-    MessageSelection messages;          ///< others are skipped
+    MessageSelection messages;          ///< others are skipped; what is not to be written is not observed
     DecodeProgress* progress = nullptr; ///< gets the offset of every message, selected or not; may be null
     /// A message that ends the application ends the program here as well.
     bool isStrict = false;

@@ -16,6 +16,8 @@ namespace velmora {
 /// Which messages of a file a command takes, as its options say.
 struct MessageSelection {
     TimeRange range;
+    /// Messages before the start of the range are decoded without being written.
+    bool isWarm = false;
     /// Only records of these log codes, as LogMessage::logCode returns them; empty for all messages.
     std::vector<std::uint32_t> codes;
 };
@@ -25,15 +27,23 @@ class MessageFilter {
 public:
     explicit MessageFilter(MessageSelection selection) : _selection(std::move(selection)) {}
 
-    /// Whether the message is selected. Call it once for each message of the file, in order.
+    /// Whether the message is to be decoded. Call it once for each message of the file, in order.
     [[nodiscard]] bool passes(const LoggedMessage& message) {
         if (!_first)
             _first = message.time;
-        return _selection.range.contains(message.time, *_first) &&
+        return decodedRange().contains(message.time, *_first) &&
                (_selection.codes.empty() || hasCode(message));
     }
 
+    /// Whether what happens at that time is to be written. Precondition: there has been a message.
+    [[nodiscard]] bool writes(Time moment) const {
+        return !_selection.isWarm || TimeRange{_selection.range.from, std::nullopt}.contains(moment, *_first);
+    }
+
 private:
+    [[nodiscard]] TimeRange decodedRange() const {
+        return _selection.isWarm ? TimeRange{std::nullopt, _selection.range.to} : _selection.range;
+    }
     [[nodiscard]] bool hasCode(const LoggedMessage& message) const;
 
     MessageSelection _selection;

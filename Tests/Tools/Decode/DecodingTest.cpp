@@ -92,7 +92,7 @@ protected:
         reader.refreshes = std::move(told);
         WorkContext context("test");
         Observer observer;
-        const Result<Decoded> decoded = decodeMessages(reader, {{}, {range, {}}}, context, observer);
+        const Result<Decoded> decoded = decodeMessages(reader, {{}, {range, false, {}}}, context, observer);
         EXPECT_TRUE(decoded);
         EXPECT_EQ(decoded->messages, observer.messages);
         return observer.refreshes;

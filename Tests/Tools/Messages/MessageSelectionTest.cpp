@@ -18,7 +18,7 @@ LoggedMessage messageAt(int seconds, Data message = {}) {
 }
 
 TEST(MessageSelectionTest, BoundsCountFromTheFirstMessageWhetherOrNotItIsSelected) {
-    MessageFilter filter({{TimeBound{std::chrono::seconds(2), true}, std::nullopt}, {}});
+    MessageFilter filter({{TimeBound{std::chrono::seconds(2), true}, std::nullopt}, false, {}});
     EXPECT_FALSE(filter.passes(messageAt(100)));
     EXPECT_FALSE(filter.passes(messageAt(101)));
     EXPECT_TRUE(filter.passes(messageAt(102)));
@@ -26,7 +26,7 @@ TEST(MessageSelectionTest, BoundsCountFromTheFirstMessageWhetherOrNotItIsSelecte
 }
 
 TEST(MessageSelectionTest, CodesAreThoseOfTheRecordAndItsStream) {
-    MessageFilter filter({{}, {0x512C, 0xFF0001}});
+    MessageFilter filter({{}, false, {0x512C, 0xFF0001}});
     EXPECT_TRUE(filter.passes(messageAt(0, record(0x512C, "00"))));
     EXPECT_TRUE(filter.passes(messageAt(0, joined(hex("81 00"), record(0x512C, "00")))));
     EXPECT_TRUE(filter.passes(messageAt(0, record(0x0001, "", 0xFF))));
