@@ -13,6 +13,7 @@
 #include <optional>
 #include <string>
 #include <string_view>
+#include <vector>
 
 namespace velmora {
 
@@ -33,12 +34,13 @@ inline constexpr const char* formSuffixes = ".pcapng, .velmora or .dlf";
 /// What is converted, and into what.
 struct Conversion {
     FileForm form = FileForm::Recording;
-    std::string title;         ///< of the input
-    std::string name;          ///< of the output
-    std::string technology;    ///< overrides the input's; empty for the input's
-    MessageSelection messages; ///< others are left out
-    std::string description;   ///< a snapshot's
-    bool isStrict = false;     ///< see DecodingRequest; for a snapshot, for which the messages are decoded
+    std::string title;                     ///< of the input
+    std::string name;                      ///< of the output
+    std::string technology;                ///< overrides the input's, or chooses one; empty for the input's
+    std::vector<std::string> technologies; ///< see DecodingRequest
+    MessageSelection messages;             ///< others are left out
+    std::string description;               ///< a snapshot's
+    bool isStrict = false; ///< see DecodingRequest; for a snapshot, for which the messages are decoded
     /// The input's number of refreshes (see countRefreshes), if it could be read twice: a snapshot needs the
     /// history of the last of them only, and skipping the rest is much faster.
     std::optional<std::uint64_t> refreshes;

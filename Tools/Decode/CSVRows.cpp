@@ -17,6 +17,11 @@ CSVRows::CSVRows(Output& output, bool isLive, const DecodeOptions& options, cons
     _fileCell = cell.view();
 }
 
+void CSVRows::willConcern(const Decoded& decoded) {
+    if (_options.hasTechnologyColumn)
+        _technologyCell = "," + decoded.technology;
+}
+
 void CSVRows::didDecode(const LoggedMessage& message, LogGenerator& decoder, Dictionary& state) {
     if (_options.every == DecodeOptions::Every::Message)
         writeRow(message.time, decoder.display(state));
@@ -31,6 +36,8 @@ void CSVRows::didRefresh(Time tick, const Decoded& decoded) {
 std::string CSVRows::header(const DecodeOptions& options) {
     TextBuffer row;
     row.append(options.files.size() > 1 ? "time,file" : "time");
+    if (options.hasTechnologyColumn)
+        row.append(",technology");
     for (const std::string& path : options.selection.paths()) {
         row.append(',');
         appendCsvText(row, path);
@@ -42,6 +49,7 @@ std::string CSVRows::header(const DecodeOptions& options) {
 void CSVRows::writeRow(Time moment, const Value& display) {
     appendTime(moment);
     line().append(_fileCell);
+    line().append(_technologyCell);
     for (const std::string& path : _options.selection.paths()) {
         line().append(',');
         appendCsvCell(line(), NodeSelection::find(display, path));

@@ -13,7 +13,6 @@
 #include "Tools/LogOverride.h"
 #include "Tools/Output.h"
 #include "Tools/Report.h"
-#include "Tools/Text/PrintableText.h"
 
 #include <algorithm>
 #include <memory>
@@ -58,20 +57,45 @@ private:
     std::optional<DecodeProgress> _progress;
 };
 
+/// Whether a file's technologies have to be known from the start.
+bool needsTechnologies(const DecodeOptions& options) {
+    return !options.technology.empty() || (options.format == DecodeOptions::Format::JsonLines &&
+                                           options.every == DecodeOptions::Every::Message);
+}
+
+/// Whether csv needs a column for the technology. Only files that can be read twice are looked at, and they
+/// make it a rule for the others as well.
+bool needsTechnologyColumn(const DecodeOptions& options) {
+    return options.format == DecodeOptions::Format::Csv && options.technology.empty() &&
+           std::any_of(options.files.begin(), options.files.end(),
+                       [](const std::string& file) { return technologiesOf(file).size() > 1; });
+}
+
+DecodingRequest requestFor(const std::string& path, const DecodeOptions& options) {
+    using Several = DecodingRequest::Several;
+    DecodingRequest request;
+    request.technology = options.technology;
+    request.messages = options.messages;
+    request.isStrict = options.isStrict;
+    const bool lacksColumn = options.format == DecodeOptions::Format::Csv && !options.hasTechnologyColumn;
+    request.several = lacksColumn && options.technology.empty() ? Several::First : Several::Decode;
+    if (needsTechnologies(options))
+        request.technologies = technologiesOf(path);
+    return request;
+}
+
 /// Decodes one file and prints it. Returns whether all of it was read.
 bool decodeFile(std::size_t index, const DecodeOptions& options, bool showsProgress, Output& output) {
     const std::string& path = options.files[index];
     const std::string title = fileTitle(path);
+    DecodingRequest request = requestFor(path, options);
     const Result<std::unique_ptr<MessageReader>> reader = openMessages(path);
     if (!reader) {
         report(title + ": " + reader.reason());
         return false;
     }
-    std::string heading;
-    if (options.files.size() > 1)
-        heading = (index > 0 ? "\n== " : "== ") + printable(title) + " ==\n";
     const bool isLive = !inputSize(path);
-    const std::unique_ptr<DecodeWriter> writer = DecodeWriter::make(options, path, isLive, heading, output);
+    const std::unique_ptr<DecodeWriter> writer = DecodeWriter::make(options, index, isLive, output);
     std::optional<ShownProgress> progress;
     if (showsProgress)
         progress.emplace(path, options);
@@ -83,13 +107,12 @@ bool decodeFile(std::size_t index, const DecodeOptions& options, bool showsProgr
         clearProgress();
         writer->flush();
     });
-    const Result<Decoded> decoded = decodeMessages(
-        **reader,
-        {options.technology, options.messages, progress ? progress->get() : nullptr, options.isStrict},
-        context, *writer);
+    request.progress = progress ? progress->get() : nullptr;
+    const Result<DecodedFile> decoded = decodeMessages(**reader, request, context, *writer);
     clearProgress();
     if (decoded)
-        writer->finish(*decoded);
+        for (const Decoded& technology : decoded->technologies)
+            writer->finish(technology);
     else
         report(title + ": " + decoded.reason());
     const bool allDecoded = decoded && decoded->undecoded.report(title);
@@ -99,7 +122,9 @@ bool decodeFile(std::size_t index, const DecodeOptions& options, bool showsProgr
 
 } // namespace
 
-int runDecode(const DecodeOptions& options, Output& output) {
+int runDecode(const DecodeOptions& given, Output& output) {
+    DecodeOptions options = given;
+    options.hasTechnologyColumn = needsTechnologyColumn(options);
     if (options.format == DecodeOptions::Format::Csv)
         output.put(CSVRows::header(options));
     // Standard input that is named twice is read by one process: the second reader gets what is left.

@@ -83,7 +83,9 @@ CLI::App* addDecode(CLI::App& app, DecodeOptions& options) {
     command->footer(
         "With several files, text has the files' names as headings, json is one object after another,\n"
         "and jsonl and csv have the \"file\" in each line. All JSON conforms to velmora-log.schema.json.\n"
-        "A csv cell without a value is empty.\n\n" +
+        "A csv cell without a value is empty.\n\n"
+        "Of a file of several technologies each is decoded by itself: text and json have one display after\n"
+        "the other, and each line of jsonl and csv names its technology.\n\n" +
         std::string(timeHelp) +
         "\nExamples:\n"
         "  velmora-log decode drive.pcapng\n"

@@ -30,10 +30,12 @@ struct DecodeOptions {
     Every every = Every::Refresh; ///< `Message` for JsonLines and Csv alone
     NodeSelection selection;      ///< not empty for Csv; empty for JsonLines with `Message`
     MessageSelection messages;
-    std::string technology; ///< overrides the file's; empty for the file's
+    std::string technology; ///< overrides the file's, or chooses one of several; empty for the file's
     bool isStrict = false;  ///< a message that ends the application ends decoding as well
     std::size_t jobs = 1;   ///< how many files are decoded in parallel
     std::vector<std::string> files;
+    /// Csv rows name their technology. Not an option: it follows from the files.
+    bool hasTechnologyColumn = false;
 };
 
 /// Adds the command with its options, help and examples. Parsing fills `options`, which must outlive `app`.

@@ -7,15 +7,17 @@
 #include "Tools/Decode/FinalDisplay.h"
 #include "Tools/Decode/JSONLines.h"
 #include "Tools/Output.h"
+#include "Tools/Report.h"
+#include "Tools/Text/PrintableText.h"
 
-#include <utility>
+#include <string>
 
 namespace velmora {
 
-std::unique_ptr<DecodeWriter> DecodeWriter::make(const DecodeOptions& options, const std::string& file,
-                                                 bool isLive, std::string heading, Output& output) {
+std::unique_ptr<DecodeWriter> DecodeWriter::make(const DecodeOptions& options, std::size_t index, bool isLive,
+                                                 Output& output) {
     using Format = DecodeOptions::Format;
-    const std::string named = options.files.size() > 1 ? file : std::string();
+    const std::string named = options.files.size() > 1 ? options.files[index] : std::string();
     switch (options.format) {
     case Format::JsonLines:
         if (options.every == DecodeOptions::Every::Message)
@@ -25,7 +27,8 @@ std::unique_ptr<DecodeWriter> DecodeWriter::make(const DecodeOptions& options, c
     case Format::Text:
     case Format::Json: break;
     }
-    return std::make_unique<FinalDisplay>(output, options, std::move(heading));
+    const std::string title = named.empty() ? std::string() : printable(fileTitle(named));
+    return std::make_unique<FinalDisplay>(output, options, title, index == 0);
 }
 
 bool DecodeWriter::isDone() const {

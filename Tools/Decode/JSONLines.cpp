@@ -54,6 +54,11 @@ void RefreshLines::didRefresh(Time tick, const Decoded& decoded) {
 MessageLines::MessageLines(Output& output, bool isLive, const std::string& file)
     : LineWriter(output, isLive), _begin(beginOf(file)) {}
 
+void MessageLines::willConcern(const Decoded& decoded) {
+    if (decoded.isOneOfSeveral)
+        _technology = "\",\"technology\":\"" + decoded.technology;
+}
+
 void MessageLines::didDecode(const LoggedMessage&, LogGenerator&, Dictionary&) {
     endLine(_end);
 }
@@ -80,6 +85,7 @@ void MessageLines::display(const Value& display) {
 void MessageLines::begin() {
     line().append(_begin);
     appendTime(_moment);
+    line().append(_technology);
     _end = "}}\n";
     _first = true;
 }

@@ -22,10 +22,12 @@ private:
 };
 
 /// One JSON object a line for each message: its time, its code (null for a message that was dropped), and
-/// what it concerned: "sections", "values" or, without a code, "display".
+/// what it concerned: "sections", "values" or, without a code, "display". The technology follows the time
+/// where the file holds several.
 class MessageLines final : public LineWriter, private MessageEffects {
 public:
     MessageLines(Output& output, bool isLive, const std::string& file);
+    void willConcern(const Decoded& decoded) override;
     void willDecode(const LoggedMessage& message) override { _moment = message.time; }
     [[nodiscard]] MessageEffects* effects() override { return this; }
     [[nodiscard]] bool wantsEveryRefresh() const override { return false; }
@@ -43,6 +45,7 @@ private:
     void member(std::string_view name, const Value& value);
 
     std::string _begin;
+    std::string _technology; ///< the member, from the quote after the time on to that before the next comma
     Time _moment{};
     std::string_view _end; ///< the end of the current line
     bool _first = true;    ///< no member of it so far

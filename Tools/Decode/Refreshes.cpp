@@ -5,9 +5,14 @@
 
 namespace velmora {
 
-std::uint64_t countRefreshes(MessageReader& reader, const MessageSelection& messages) {
+std::uint64_t countRefreshes(MessageReader& reader, const MessageSelection& messages,
+                             std::optional<std::uint32_t> technology) {
     Refreshes refreshes;
     MessageFilter filter(messages);
+    if (technology) {
+        reader.setReadsAllTechnologies(true);
+        filter.setTechnology(*technology);
+    }
     for (;;) {
         const std::optional<LoggedMessage> message = reader.next();
         if (!message)

@@ -27,11 +27,15 @@ class MessageFilter {
 public:
     explicit MessageFilter(MessageSelection selection) : _selection(std::move(selection)) {}
 
+    /// From now on only messages of the technology of that index are selected.
+    void setTechnology(std::uint32_t technology) { _technology = technology; }
+
     /// Whether the message is to be decoded. Call it once for each message of the file, in order.
     [[nodiscard]] bool passes(const LoggedMessage& message) {
         if (!_first)
             _first = message.time;
-        return decodedRange().contains(message.time, *_first) &&
+        return (!_technology || message.technology == *_technology) &&
+               decodedRange().contains(message.time, *_first) &&
                (_selection.codes.empty() || hasCode(message));
     }
 
@@ -48,6 +52,7 @@ private:
 
     MessageSelection _selection;
     std::optional<Time> _first; ///< the time of the file's first message
+    std::optional<std::uint32_t> _technology;
 };
 
 } // namespace velmora
