@@ -120,12 +120,11 @@ void decodeDrive(benchmark::State& state) {
         DriveReader reader(kind, count);
         for (auto step : state) {
             reader.rewind();
-            const std::unique_ptr<DecodeWriter> writer =
-                DecodeWriter::make(options, "drive", false, "", output);
-            const Result<Decoded> decoded = decodeMessages(reader, {}, context, *writer);
+            const std::unique_ptr<DecodeWriter> writer = DecodeWriter::make(options, 0, false, output);
+            const Result<DecodedFile> decoded = decodeMessages(reader, {}, context, *writer);
             if (!decoded)
                 std::abort();
-            writer->finish(*decoded);
+            writer->finish(decoded->technologies.front());
         }
     }
     setResources(nullptr);

@@ -5,6 +5,12 @@
 
 namespace velmora {
 
+std::vector<std::string> MessageReader::technologies() const {
+    if (technology().empty())
+        return {};
+    return {technology()};
+}
+
 void MessageReader::addLoss(Loss loss) {
     ++_lossTotals.losses;
     _lossTotals.bytes += loss.bytes;

@@ -29,6 +29,7 @@ struct LoggedMessage {
     /// The refresh between this message and the next, where the file records refreshes, as a snapshot does.
     /// In such a file these are all refreshes, whatever the messages' times.
     std::optional<Time> refresh = std::nullopt;
+    std::uint32_t technology = 0; ///< which of the reader's `technologies` it belongs to
 };
 
 /// A part of the file that should have been a message but could not be read.
@@ -60,7 +61,13 @@ public:
     /// The next message; none at the end of the file, or once reading has failed (see `failure`).
     [[nodiscard]] virtual std::optional<LoggedMessage> next() = 0;
     /// The short name of the technology whose messages these are ("Ostrel_GSM"); empty while it is unknown.
+    /// Where the file holds several, the first one that it names.
     [[nodiscard]] virtual const std::string& technology() const = 0;
+    /// The short names of all technologies that the file has named so far, in its order.
+    [[nodiscard]] virtual std::vector<std::string> technologies() const;
+    /// Whether `next` returns the messages of all technologies; the default is those of the first alone, and
+    /// the others are losses.
+    virtual void setReadsAllTechnologies(bool) {}
     /// The file's form, for messages: "recording", "snapshot", "DLF log".
     [[nodiscard]] virtual std::string_view form() const { return "recording"; }
     /// The read error that ended the stream early; absent when it ended with the file.

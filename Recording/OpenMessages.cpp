@@ -9,7 +9,9 @@
 #include "Recording/Snapshots/SnapshotReader.h"
 
 #include <algorithm>
+#include <filesystem>
 #include <string_view>
+#include <system_error>
 #include <utility>
 
 namespace velmora {
@@ -50,6 +52,18 @@ Result<std::unique_ptr<MessageReader>> openMessages(const std::string& path) {
     if (!source)
         return Failure{source.reason()};
     return openMessages(ChunkedInput(*std::move(source)));
+}
+
+std::vector<std::string> technologiesOf(const std::string& path) {
+    std::error_code error;
+    if (path == "-" || !std::filesystem::is_regular_file(path, error))
+        return {};
+    const Result<std::unique_ptr<PcapngReader>> reader = PcapngReader::open(path);
+    if (!reader)
+        return {};
+    while ((*reader)->next()) {
+    }
+    return (*reader)->technologies();
 }
 
 Result<std::unique_ptr<MessageReader>> openMessages(ChunkedInput input) {

@@ -9,6 +9,7 @@
 
 #include <memory>
 #include <string>
+#include <vector>
 
 namespace velmora {
 
@@ -17,5 +18,9 @@ namespace velmora {
 Result<std::unique_ptr<MessageReader>> openMessages(const std::string& path);
 /// As above, for an input of which nothing has been skipped.
 Result<std::unique_ptr<MessageReader>> openMessages(ChunkedInput input);
+
+/// The technologies that a recording names, all of which is read for that; none for other forms, which hold
+/// one at most, for a file that is not a regular one, and for one that cannot be read.
+[[nodiscard]] std::vector<std::string> technologiesOf(const std::string& path);
 
 } // namespace velmora

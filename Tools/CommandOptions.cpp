@@ -42,7 +42,10 @@ CLI::Validator positiveCount() {
 void addTechnology(CLI::App& command, std::string& technology, const std::string& purpose) {
     command
         .add_option("--technology", technology,
-                    purpose + " this technology, overriding the file's: " + technologyNames())
+                    purpose +
+                        " this technology, overriding the file's; of a file of several technologies, this "
+                        "one alone: " +
+                        technologyNames())
         ->type_name("NAME");
 }
 

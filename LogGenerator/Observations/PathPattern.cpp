@@ -110,6 +110,15 @@ std::optional<std::string_view> PathPattern::after(std::string_view path, bool a
     return isEnd(path) ? std::optional(path) : std::nullopt;
 }
 
+std::optional<std::string_view> PathPattern::below(std::string_view path, const CatalogueNode& place) {
+    if (!place.parent() || path == "/")
+        return path == "/" ? std::string_view() : path;
+    const std::optional<std::string_view> above = below(path, *place.parent());
+    if (!above || above->empty())
+        return above;
+    return after(*above, !place.parent()->parent(), place.name());
+}
+
 std::optional<PathPattern::Rows> PathPattern::select(const CatalogueField& leaf) const {
     std::vector<const Node*> nodes;
     for (const Node* node = leaf.node; node->parent(); node = node->parent())

@@ -36,6 +36,11 @@ public:
     [[nodiscard]] static std::optional<std::string_view> after(std::string_view path, bool atRoot,
                                                                std::string_view name);
 
+    /// What is left of a path below a place; empty where it selects the place or what the place is in, absent
+    /// where it does not lead there.
+    [[nodiscard]] static std::optional<std::string_view> below(std::string_view path,
+                                                               const CatalogueNode& place);
+
 private:
     std::string _text;
 };

@@ -113,11 +113,31 @@ void PcapngReader::addInterface(const Block& block) {
         return;
     }
     _foundInterface = true;
-    const std::string_view name = shortTechnologyName(interface.description.name);
-    if (_technology.empty())
-        _technology = name;
-    else if (!name.empty() && name != _technology)
+    const std::optional<std::uint32_t> technology =
+        technologyIndex(shortTechnologyName(interface.description.name));
+    if (technology)
+        interface.technology = *technology;
+    else
         interface.use = Use::OtherTechnology;
+}
+
+std::optional<std::uint32_t> PcapngReader::technologyIndex(std::string_view name) {
+    if (name.empty())
+        return 0;
+    if (_technologies.front().empty())
+        _technologies.front() = name;
+    const auto found = std::find(_technologies.begin(), _technologies.end(), name);
+    const auto index = static_cast<std::uint32_t>(found - _technologies.begin());
+    if (found == _technologies.end()) {
+        if (_technologies.size() == maximumTechnologies)
+            return std::nullopt;
+        _technologies.emplace_back(name);
+    }
+    return index;
+}
+
+std::vector<std::string> PcapngReader::technologies() const {
+    return technology().empty() ? std::vector<std::string>() : _technologies;
 }
 
 void PcapngReader::readMessage(const Block& block, std::optional<LoggedMessage>& message) {
@@ -134,7 +154,8 @@ void PcapngReader::readMessage(const Block& block, std::optional<LoggedMessage>&
     const bool whole = packet.offset <= room && packet.captured <= room - packet.offset &&
                        packet.captured == packet.original && packet.captured <= maximumMessageSize;
     std::optional<Time> time;
-    if (interface != nullptr && interface->use == Use::Messages && whole)
+    if (interface != nullptr && interface->use == Use::Messages && whole &&
+        (interface->technology == 0 || _readsAllTechnologies))
         time = packet.hasStamp ? interface->description.time(packet.stamp) : _lastTime;
     if (!time) {
         // Thousands of these are possible; only those that are kept need a reason.
@@ -147,6 +168,7 @@ void PcapngReader::readMessage(const Block& block, std::optional<LoggedMessage>&
     made.message = _blocks.part(packet.offset, packet.captured);
     made.number = number;
     made.offset = block.offset;
+    made.technology = interface->technology;
 }
 
 /// Fields that the block is too short for read as 0, and its bytes then begin past its end.
@@ -186,9 +208,9 @@ std::string PcapngReader::packetProblem(const Packet& packet, const Block& block
     if (interface.use == Use::Unreadable)
         return "message of interface " + std::to_string(packet.interface) +
                ", whose description was not readable";
-    if (interface.use == Use::OtherTechnology)
+    if (interface.use == Use::OtherTechnology || (interface.technology != 0 && !_readsAllTechnologies))
         return "message of " + std::string(shortTechnologyName(interface.description.name)) +
-               " in a recording of " + _technology;
+               " in a recording of " + technology();
     if (packet.captured > room - packet.offset)
         return "message of " + std::to_string(packet.captured) + " bytes in a block with room for " +
                std::to_string(room - packet.offset);

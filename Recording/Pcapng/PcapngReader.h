@@ -8,10 +8,12 @@
 #include "Recording/Pcapng/BlockReader.h"
 #include "Recording/Pcapng/InterfaceDescription.h"
 
+#include <cstddef>
 #include <cstdint>
 #include <memory>
 #include <optional>
 #include <string>
+#include <string_view>
 #include <utility>
 #include <vector>
 
@@ -22,8 +24,8 @@ namespace velmora {
 /// Reads recordings also after capture tools have cut and merged them: both byte orders, several sections and
 /// interfaces, any time resolution, all three kinds of packet blocks; other blocks are skipped. An
 /// interface's name is its technology. The first one named is the recording's; messages of interfaces without
-/// a name belong to it as well, those of another technology are losses. Interfaces of other link types are
-/// counted and otherwise ignored.
+/// a name belong to it as well, those of another technology are losses unless all technologies are read.
+/// Interfaces of other link types are counted and otherwise ignored.
 ///
 /// Where a block is damaged, reading resumes at the next block that is not. Memory is bounded for any
 /// content; a message is a window on the reader's chunk and keeps that alive: copy messages that are kept for
@@ -36,6 +38,9 @@ public:
         std::uint64_t packets = 0;    ///< on such interfaces
     };
 
+    /// How many technologies of a file are read; messages of further ones are losses.
+    static constexpr std::size_t maximumTechnologies = 16;
+
     /// Opens a file, "-" being standard input, and reads up to its first interface of log messages, or its
     /// first packet. Fails when it cannot be read or is no pcapng file; the reason does not repeat the path.
     static Result<std::unique_ptr<PcapngReader>> open(const std::string& path);
@@ -43,7 +48,9 @@ public:
     static Result<std::unique_ptr<PcapngReader>> open(ChunkedInput input);
 
     [[nodiscard]] std::optional<LoggedMessage> next() override;
-    [[nodiscard]] const std::string& technology() const override { return _technology; }
+    [[nodiscard]] const std::string& technology() const override { return _technologies.front(); }
+    [[nodiscard]] std::vector<std::string> technologies() const override;
+    void setReadsAllTechnologies(bool all) override { _readsAllTechnologies = all; }
     [[nodiscard]] const std::optional<Failure>& failure() const override { return _blocks.failure(); }
     [[nodiscard]] const PassedOver& passedOver() const { return _passedOver; }
 
@@ -53,6 +60,7 @@ private:
     struct Interface {
         enum class Use : std::uint8_t { Messages, OtherTechnology, OtherLinkType, Unreadable };
         Use use = Use::Messages;
+        std::uint32_t technology = 0; ///< its index; of messages
         InterfaceDescription description;
     };
 
@@ -69,6 +77,8 @@ private:
     explicit PcapngReader(ChunkedInput input) : _blocks(std::move(input)) {}
 
     [[nodiscard]] const Block* nextBlock();
+    /// The index of the technology, which is added where it is new; none above the most that are read.
+    [[nodiscard]] std::optional<std::uint32_t> technologyIndex(std::string_view name);
     void readBlock(const Block& block);
     void addInterface(const Block& block);
     /// Reads a packet's message, unless the packet is ignored or a loss.
@@ -78,10 +88,11 @@ private:
     void addLossOf(const Block& block, std::uint64_t number, std::string reason);
 
     BlockReader _blocks;
-    const Block* _waiting = nullptr;    ///< the packet that `open` stopped at
-    std::vector<Interface> _interfaces; ///< of the present section
-    bool _foundInterface = false;       ///< an interface of log messages has been read
-    std::string _technology;
+    const Block* _waiting = nullptr;                       ///< the packet that `open` stopped at
+    std::vector<Interface> _interfaces;                    ///< of the present section
+    bool _foundInterface = false;                          ///< an interface of log messages has been read
+    std::vector<std::string> _technologies{std::string()}; ///< the first is empty while none has been named
+    bool _readsAllTechnologies = false;
     std::uint64_t _packets = 0; ///< packet blocks read
     Time _lastTime{};
     PassedOver _passedOver;

@@ -81,8 +81,8 @@ _velmora_log() {
     local i command='' files=0
     for ((i = 1; i < cword; ++i)); do
         case ${words[i]} in
-        --log | --log-level | --format | --every | --select | --from | --to | --technology | --jobs | --duration | \
-            --count | --description)
+        --log | --log-level | --format | --every | --select | --from | --to | --code | --technology | --jobs | \
+            --duration | --count | --description)
             ((++i))
             ;;
         -?*) ;;
@@ -108,7 +108,7 @@ _velmora_log() {
         _velmora_offer "${_velmora_technologies[@]}"
         return
         ;;
-    --select | --from | --to | --jobs | --duration | --count | --description)
+    --select | --from | --to | --code | --jobs | --duration | --count | --description)
         return # nothing that could be guessed
         ;;
     esac
@@ -124,10 +124,10 @@ _velmora_log() {
         fi
         return
         ;;
-    decode) options+=(--format --every --select --from --to --technology --jobs) ;;
+    decode) options+=(--format --every --select --from --to --code --warm --technology --strict --jobs) ;;
     watch) options+=(--once) ;;
     record) options+=(--force --duration --count) ;;
-    convert) options+=(--force --technology --description) ;;
+    convert) options+=(--force --from --to --code --technology --description --strict) ;;
     info) options+=(--technology) ;;
     esac
     if [[ $cur == -* ]]; then

@@ -55,6 +55,19 @@ TEST_F(OpenMessages, opensARecordingOfAnyName) {
     EXPECT_FALSE((*reader)->failure());
 }
 
+TEST_F(OpenMessages, findsTheTechnologiesOfAllOfARecording) {
+    PcapngFile file;
+    file.head().message(7, hex("0102").bytes());
+    // As recordings put one after another have them.
+    file.section().messageInterface("Ostrel_LTE").message(8, hex("03").bytes());
+    EXPECT_EQ(technologiesOf(fileOf(file.data())), (std::vector<std::string>{"Ostrel_GSM", "Ostrel_LTE"}));
+    const std::vector<std::string> none;
+    EXPECT_EQ(technologiesOf(fileOf(hex("00 01"), "noise")), none);
+    EXPECT_EQ(technologiesOf("-"), none);
+    EXPECT_EQ(technologiesOf("/dev/null"), none);
+    EXPECT_EQ(technologiesOf(_directory / "gone"), none);
+}
+
 TEST_F(OpenMessages, readsStandardInputThroughAPipe) {
     int ends[2];
     ASSERT_EQ(::pipe(ends), 0);

@@ -73,6 +73,43 @@ TEST(PcapngReader, takesTheFirstTechnologyAndReportsTheOthersAsLosses) {
         ElementsAre("at 276, 36 bytes, record 3: message of Ostrel_GSM in a recording of Ostrel_LTE"));
 }
 
+TEST(PcapngReader, readsAllTechnologiesWhereThatIsAskedFor) {
+    PcapngFile file;
+    file.section().messageInterface("").messageInterface("Ostrel_LTE").messageInterface("Ostrel_GSM");
+    for (std::uint32_t interface = 0; interface < 3; ++interface)
+        file.message(interface, hex("AA").bytes(), interface);
+    file.section().messageInterface("Ostrel_GSM").message(3, hex("BB").bytes());
+    auto reader = PcapngReader::open(ChunkedInput(std::make_unique<MemorySource>(file.data())));
+    ASSERT_TRUE(reader);
+    (*reader)->setReadsAllTechnologies(true);
+    std::vector<std::uint32_t> technologies;
+    while (const auto message = (*reader)->next())
+        technologies.push_back(message->technology);
+    // An interface without a name belongs to the first that has one.
+    EXPECT_THAT(technologies, ElementsAre(0, 0, 1, 1));
+    EXPECT_THAT((*reader)->technologies(), ElementsAre("Ostrel_LTE", "Ostrel_GSM"));
+    EXPECT_EQ((*reader)->technology(), "Ostrel_LTE");
+    EXPECT_THAT((*reader)->losses(), IsEmpty());
+}
+
+TEST(PcapngReader, readsSixteenTechnologiesAtMost) {
+    PcapngFile file;
+    file.section();
+    for (int i = 0; i < 17; ++i)
+        file.messageInterface("T" + std::to_string(10 + i)); // 40 bytes each
+    file.message(1, hex("AA").bytes(), 15).message(2, hex("BB").bytes(), 16);
+    auto reader = PcapngReader::open(ChunkedInput(std::make_unique<MemorySource>(file.data())));
+    ASSERT_TRUE(reader);
+    (*reader)->setReadsAllTechnologies(true);
+    const auto message = (*reader)->next();
+    ASSERT_TRUE(message);
+    EXPECT_EQ(message->technology, 15U);
+    EXPECT_FALSE((*reader)->next());
+    EXPECT_EQ((*reader)->technologies().size(), 16U);
+    ASSERT_EQ((*reader)->losses().size(), 1U);
+    EXPECT_EQ((*reader)->losses()[0].reason, "message of T26 in a recording of T10");
+}
+
 TEST(PcapngReader, passesOverInterfacesOfOtherLinkTypes) {
     PcapngFile file;
     file.section().interface(1).message(1, hex("AA").bytes()).messageInterface("Ostrel_LTE");

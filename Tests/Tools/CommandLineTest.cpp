@@ -27,12 +27,18 @@ TEST(CommandLineTest, DecodeTakesFilesFormatAndTechnology) {
     EXPECT_THAT(decode->files, ElementsAre("a", "-", "b"));
     EXPECT_EQ(decode->format, DecodeOptions::Format::Json);
     EXPECT_EQ(decode->technology, "IFX");
+    EXPECT_FALSE(decode->isStrict);
+    const CommandLine strictLine = parse({"decode", "--strict", "a"});
+    const auto* strict = std::get_if<DecodeOptions>(&strictLine.command);
+    ASSERT_NE(strict, nullptr);
+    EXPECT_TRUE(strict->isStrict);
 }
 
 TEST(CommandLineTest, DecodeTakesWhatLinesAndPartsAreWanted) {
-    const CommandLine line =
-        parse({"decode", "--select", "/A/B", "--format", "csv", "--every", "message", "a", "--select=/C",
-               "--jobs", "3", "--from", "+1.5", "--to", "1970-01-01T00:01:00Z", "b"});
+    const CommandLine line = parse({"decode",  "--select", "/A/B",     "--format",    "csv",
+                                    "--every", "message",  "a",        "--select=/C", "--jobs",
+                                    "3",       "--from",   "+1.5",     "--to",        "1970-01-01T00:01:00Z",
+                                    "--code",  "0x512C",   "--code=5", "--warm",      "b"});
     const auto* decode = std::get_if<DecodeOptions>(&line.command);
     ASSERT_NE(decode, nullptr);
     EXPECT_THAT(decode->files, ElementsAre("a", "b"));
@@ -40,8 +46,10 @@ TEST(CommandLineTest, DecodeTakesWhatLinesAndPartsAreWanted) {
     EXPECT_EQ(decode->format, DecodeOptions::Format::Csv);
     EXPECT_EQ(decode->every, DecodeOptions::Every::Message);
     EXPECT_EQ(decode->jobs, 3U);
-    EXPECT_EQ(decode->range.from, (TimeBound{std::chrono::milliseconds(1500), true}));
-    EXPECT_EQ(decode->range.to, (TimeBound{std::chrono::minutes(1), false}));
+    EXPECT_EQ(decode->messages.range.from, (TimeBound{std::chrono::milliseconds(1500), true}));
+    EXPECT_EQ(decode->messages.range.to, (TimeBound{std::chrono::minutes(1), false}));
+    EXPECT_THAT(decode->messages.codes, ElementsAre(0x512C, 5));
+    EXPECT_TRUE(decode->messages.isWarm);
     const CommandLine lines = parse({"decode", "--format", "jsonl", "a"});
     const auto* plain = std::get_if<DecodeOptions>(&lines.command);
     ASSERT_NE(plain, nullptr);
@@ -49,7 +57,9 @@ TEST(CommandLineTest, DecodeTakesWhatLinesAndPartsAreWanted) {
     EXPECT_EQ(plain->every, DecodeOptions::Every::Refresh);
     EXPECT_THAT(plain->selection.paths(), testing::IsEmpty());
     EXPECT_EQ(plain->jobs, 1U);
-    EXPECT_FALSE(plain->range.from || plain->range.to);
+    EXPECT_FALSE(plain->messages.range.from || plain->messages.range.to);
+    EXPECT_THAT(plain->messages.codes, testing::IsEmpty());
+    EXPECT_FALSE(plain->messages.isWarm);
 }
 
 TEST(CommandLineTest, WithoutOptionsLogLinesOfErrorsGoToStandardError) {
@@ -88,18 +98,24 @@ TEST(CommandLineTest, RecordTakesItsLimits) {
 
 TEST(CommandLineTest, ConvertTakesWhatTheNewFileIsToBe) {
     const CommandLine line =
-        parse({"convert", "-", "a.velmora", "--force", "--technology", "IFX", "--description", "gate 4"});
+        parse({"convert", "-", "a.velmora", "--force", "--technology", "IFX", "--description", "gate 4",
+               "--strict", "--from", "+1.5", "--to", "1970-01-01T00:01:00Z", "--code", "0xFF0000"});
     const auto* convert = std::get_if<ConvertOptions>(&line.command);
     ASSERT_NE(convert, nullptr);
     EXPECT_EQ(convert->file, "-");
     EXPECT_EQ(convert->out, "a.velmora");
     EXPECT_TRUE(convert->force);
+    EXPECT_TRUE(convert->isStrict);
+    EXPECT_EQ(convert->messages.range.from, (TimeBound{std::chrono::milliseconds(1500), true}));
+    EXPECT_EQ(convert->messages.range.to, (TimeBound{std::chrono::minutes(1), false}));
+    EXPECT_THAT(convert->messages.codes, ElementsAre(0xFF0000));
     EXPECT_EQ(convert->technology, "IFX");
     EXPECT_EQ(convert->description, "gate 4");
     const CommandLine plainLine = parse({"convert", "a.dlf", "a.pcapng"});
     const auto* plain = std::get_if<ConvertOptions>(&plainLine.command);
     ASSERT_NE(plain, nullptr);
     EXPECT_FALSE(plain->force);
+    EXPECT_FALSE(plain->isStrict);
     EXPECT_EQ(plain->technology, "");
     EXPECT_EQ(plain->description, "");
 }
@@ -131,6 +147,11 @@ TEST(CommandLineTest, UsageErrorsGiveTheFoundAndTheExpectedValue) {
         {{"decode", "--to", "-1", "a"},
          "--to: got -1, wanted a time such as 2026-11-16T05:00:00Z, seconds since 1970, or +SECONDS after "
          "the first message"},
+        {{"decode", "--warm", "a"}, "--warm: got no --from, wanted the time from which on to write"},
+        {{"decode", "--code", "512C", "a"}, "--code: got 512C, wanted a log code such as 0x512C or 0xFF0000"},
+        {{"convert", "--from", "noon", "a", "b.dlf"},
+         "--from: got noon, wanted a time such as 2026-11-16T05:00:00Z, seconds since 1970, or +SECONDS "
+         "after the first message"},
         {{"decode", "--format", "csv", "a"}, "--format csv: got no --select, wanted one for each column"},
         {{"decode", "--every", "message", "a"},
          "--every message: got another format, wanted --format jsonl or csv"},

@@ -13,6 +13,7 @@
 #include "Recording/Pcapng/PcapngWriter.h"
 #include "Tools/Decode/Decoding.h"
 #include "Tools/Decode/RefreshTicks.h"
+#include "Tools/Messages/TechnologyChoice.h"
 #include "Tools/Report.h"
 #include "Tools/Technologies.h"
 
@@ -25,23 +26,44 @@ namespace velmora {
 
 namespace {
 
-/// A file's messages, the first of which has been read: a file may name its technology no earlier than there.
+/// The selected messages of a file, the first of which has been read: a file may name its technology no
+/// earlier than there.
 struct Messages {
     MessageReader& reader;
+    MessageFilter filter;
     std::optional<LoggedMessage> next;
-    std::string technology; ///< the short name
+    std::string technology = {}; ///< the short name of the first, or of the chosen one
+    bool isOne = false;          ///< by --technology
 
-    void advance() { next = reader.next(); }
+    void advance() {
+        do
+            next = reader.next();
+        while (next && !filter.passes(*next));
+    }
 };
 
 Result<Messages> begin(MessageReader& reader, const Conversion& conversion) {
+    Messages messages{reader, MessageFilter(conversion.messages), {}};
+    reader.setReadsAllTechnologies(true);
     std::optional<LoggedMessage> first = reader.next();
-    const std::string& named = conversion.technology.empty() ? reader.technology() : conversion.technology;
-    const Result<std::string> technology = technologyNamed(named);
-    if (!technology)
+    const std::vector<std::string> technologies = knownTechnologies(conversion.technologies, reader);
+    const Result<TechnologyChoice> choice = TechnologyChoice::make(conversion.technology, technologies);
+    if (!choice)
+        return Failure{conversion.title + ": " + choice.reason()};
+    const std::string named = choice->nameOf(choice->only.value_or(0), technologies);
+    if (const Result<std::string> technology = technologyNamed(named); !technology)
         return Failure{conversion.title + ": " + technology.reason() +
                        (named.empty() ? "; --technology supplies it" : "")};
-    return Messages{reader, std::move(first), std::string(shortTechnologyName(*technology))};
+    messages.technology = named;
+    if (choice->only)
+        messages.filter.setTechnology(*choice->only);
+    else if (!choice->override.empty())
+        reader.setReadsAllTechnologies(false);
+    messages.isOne = choice->only || !choice->override.empty();
+    messages.next = std::move(first);
+    if (messages.next && !messages.filter.passes(*messages.next))
+        messages.advance();
+    return messages;
 }
 
 /// A second descriptor of the file, for a writer that closes its descriptor.
@@ -75,6 +97,9 @@ Result<bool> toDLFLog(MessageReader& reader, const Conversion& conversion, int d
     Result<Messages> messages = begin(reader, conversion);
     if (!messages)
         return Failure{messages.reason()};
+    const auto refuses = [&] { return !messages->isOne && reader.technologies().size() > 1; };
+    if (refuses())
+        return Failure{conversion.title + ": " + severalTechnologies(reader.technologies())};
     if (technologyConstant(messages->technology) == kVoxLogChannelTechnology_IFX)
         return Failure{conversion.title + ": technology " + messages->technology +
                        " has no DLF log: its messages are no records"};
@@ -96,6 +121,8 @@ Result<bool> toDLFLog(MessageReader& reader, const Conversion& conversion, int d
             report(positionInFile(conversion.title, messages->next->number, messages->next->offset) +
                    ": left out: " + appended.reason());
     }
+    if (refuses())
+        return Failure{conversion.title + ": " + severalTechnologies(reader.technologies())};
     if (const std::uint64_t refused = (*writer)->refused(); refused > MessageReader::maximumLosses)
         report(conversion.title + ": left out " + std::to_string(refused) + " messages in all");
     if (const auto closed = (*writer)->close(); !closed)
@@ -133,10 +160,14 @@ Result<bool> toSnapshot(MessageReader& reader, const Conversion& conversion, int
     SaveContents saved(conversion.refreshes);
     DecodingRequest request;
     request.technology = conversion.technology;
-    const Result<Decoded> decoded = decodeMessages(reader, request, context, saved);
+    request.messages = conversion.messages;
+    request.several = DecodingRequest::Several::Refuse;
+    request.technologies = conversion.technologies;
+    request.isStrict = conversion.isStrict;
+    const Result<DecodedFile> decoded = decodeMessages(reader, request, context, saved);
     if (!decoded)
         return Failure{conversion.title + ": " + decoded.reason()};
-    if (conversion.refreshes && decoded->refreshes < *conversion.refreshes)
+    if (conversion.refreshes && decoded->technologies.front().refreshes < *conversion.refreshes)
         return Failure{conversion.title + ": became shorter while it was read"};
     // Without a refresh there is no time but now.
     const Time timeStamp = saved.tick ? *saved.tick : MachineClock().now();
@@ -147,7 +178,7 @@ Result<bool> toSnapshot(MessageReader& reader, const Conversion& conversion, int
     const Bytes content(reinterpret_cast<const std::uint8_t*>(list->data()), list->size());
     if (const Result<Done> written = writeAll(descriptor, content); !written)
         return Failure{conversion.name + ": " + written.reason()};
-    return true;
+    return decoded->undecoded.report(conversion.title);
 }
 
 } // namespace

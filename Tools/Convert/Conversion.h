@@ -6,12 +6,14 @@
 #include "Platform/Clock.h"
 #include "Platform/Result.h"
 #include "Recording/MessageReader.h"
+#include "Tools/Messages/MessageSelection.h"
 
 #include <cstdint>
 #include <memory>
 #include <optional>
 #include <string>
 #include <string_view>
+#include <vector>
 
 namespace velmora {
 
@@ -32,20 +34,24 @@ inline constexpr const char* formSuffixes = ".pcapng, .velmora or .dlf";
 /// What is converted, and into what.
 struct Conversion {
     FileForm form = FileForm::Recording;
-    std::string title;       ///< of the input
-    std::string name;        ///< of the output
-    std::string technology;  ///< overrides the input's; empty for the input's
-    std::string description; ///< a snapshot's
+    std::string title;                     ///< of the input
+    std::string name;                      ///< of the output
+    std::string technology;                ///< overrides the input's, or chooses one; empty for the input's
+    std::vector<std::string> technologies; ///< see DecodingRequest
+    MessageSelection messages;             ///< others are left out
+    std::string description;               ///< a snapshot's
+    bool isStrict = false; ///< see DecodingRequest; for a snapshot, for which the messages are decoded
     /// The input's number of refreshes (see countRefreshes), if it could be read twice: a snapshot needs the
     /// history of the last of them only, and skipping the rest is much faster.
     std::optional<std::uint64_t> refreshes;
 };
 
-/// Reads messages to their end and writes them to an open file, which the caller owns. A recording has all of
-/// them with their times; a DLF log has those that it can hold, and the others are reported; a snapshot is
-/// the one that the application would have written after the last refresh. Returns whether all messages were
-/// written. Fails where such a file cannot be made of them, or cannot be written; `context` gets each
-/// record's number, exceptions of the decoders pass through.
+/// Reads messages to their end and writes the selected ones to an open file, which the caller owns. A
+/// recording has all of them with their times; a DLF log has those that it can hold, and the others are
+/// reported; a snapshot is the one that the application would have written after the last refresh, and
+/// messages that could not be decoded are reported. Returns whether all selected messages were written. Fails
+/// where such a file cannot be made of them, or cannot be written; `context` gets each record's number,
+/// exceptions of the decoders pass through.
 [[nodiscard]] Result<bool> convertMessages(MessageReader& reader, const Conversion& conversion,
                                            int descriptor, WorkContext& context);
 

@@ -9,6 +9,7 @@
 #include "Tools/Decode/Decoding.h"
 #include "Tools/Decode/Refreshes.h"
 #include "Tools/ExitStatus.h"
+#include "Tools/Messages/TechnologyChoice.h"
 #include "Tools/Report.h"
 
 #include <algorithm>
@@ -78,12 +79,15 @@ std::string whyRefused(const ConvertOptions& options) {
 }
 
 /// How many refreshes the file takes; none where it is no regular file, which can be read but once.
-std::optional<std::uint64_t> refreshesOf(const std::string& file) {
+std::optional<std::uint64_t> refreshesOf(const std::string& file, const Conversion& conversion) {
     struct stat status = {};
     if (file == "-" || ::stat(file.c_str(), &status) != 0 || !S_ISREG(status.st_mode))
         return std::nullopt;
+    const auto choice = TechnologyChoice::make(conversion.technology, conversion.technologies);
     const Result<std::unique_ptr<MessageReader>> reader = openMessages(file);
-    return reader ? std::optional(countRefreshes(**reader)) : std::nullopt;
+    if (!choice || !reader)
+        return std::nullopt; // as will be reported
+    return countRefreshes(**reader, conversion.messages, choice->only);
 }
 
 /// Whether all of the input is in the output now.
@@ -106,9 +110,13 @@ bool convert(const ConvertOptions& options, MessageReader& reader, const std::st
     conversion.title = title;
     conversion.name = options.out;
     conversion.technology = options.technology;
+    if (!options.technology.empty())
+        conversion.technologies = technologiesOf(options.file);
+    conversion.messages = options.messages;
     conversion.description = options.description;
+    conversion.isStrict = options.isStrict;
     if (conversion.form == FileForm::Snapshot)
-        conversion.refreshes = refreshesOf(options.file);
+        conversion.refreshes = refreshesOf(options.file, conversion);
     const Result<bool> converted = convertMessages(reader, conversion, output->descriptor(), context);
     if (!converted) {
         report(converted.reason());

@@ -3,6 +3,8 @@
 
 #pragma once
 
+#include "Tools/Messages/MessageSelection.h"
+
 #include <string>
 
 namespace CLI {
@@ -17,9 +19,11 @@ struct ConvertOptions {
     std::string file; ///< "-" for standard input
     /// The output; precondition: its name has a form, see `formFromName`.
     std::string out;
+    MessageSelection messages;
     bool force = false;      ///< replace an existing file
     std::string technology;  ///< overrides the file's; empty for the file's
     std::string description; ///< a snapshot's
+    bool isStrict = false;   ///< for a snapshot: see DecodeOptions
 };
 
 /// Adds the command with its options, help and examples. Parsing fills `options`, which must outlive `app`.

@@ -9,13 +9,18 @@
 namespace velmora {
 
 CSVRows::CSVRows(Output& output, bool isLive, const DecodeOptions& options, const std::string& file)
-    : LineWriter(output, isLive), _options(options) {
+    : LineWriter(output, isLive), _options(options), _ages(options.maximumAge) {
     if (file.empty())
         return;
     TextBuffer cell;
     cell.append(',');
     appendCsvText(cell, file);
     _fileCell = cell.view();
+}
+
+void CSVRows::willConcern(const Decoded& decoded) {
+    if (_options.hasTechnologyColumn)
+        _technologyCell = "," + decoded.technology;
 }
 
 void CSVRows::didDecode(const LoggedMessage& message, LogGenerator& decoder, Dictionary& state) {
@@ -25,13 +30,15 @@ void CSVRows::didDecode(const LoggedMessage& message, LogGenerator& decoder, Dic
 
 void CSVRows::didRefresh(Time tick, const Decoded& decoded) {
     if (_options.every == DecodeOptions::Every::Refresh)
-        writeRow(tick, decoded.display);
+        writeRow(tick, _ages.fresh(decoded, tick));
     LineWriter::didRefresh(tick, decoded);
 }
 
 std::string CSVRows::header(const DecodeOptions& options) {
     TextBuffer row;
     row.append(options.files.size() > 1 ? "time,file" : "time");
+    if (options.hasTechnologyColumn)
+        row.append(",technology");
     for (const std::string& name : options.selection.names()) {
         row.append(',');
         appendCsvText(row, name);
@@ -43,6 +50,7 @@ std::string CSVRows::header(const DecodeOptions& options) {
 void CSVRows::writeRow(Time moment, const Value& display) {
     appendTime(moment);
     line().append(_fileCell);
+    line().append(_technologyCell);
     for (const std::string& path : _options.selection.paths()) {
         line().append(',');
         if (NodeSelection::hasWildcard(path))

@@ -9,15 +9,14 @@
 #include "Tools/Decode/DecodeProgress.h"
 #include "Tools/Decode/DecodeWriter.h"
 #include "Tools/Decode/Jobs/JobScheduler.h"
+#include "Tools/Decode/KnownCatalogues.h"
 #include "Tools/Decode/PathCheck.h"
-#include "Tools/Decode/Samples/SampleWriter.h"
+#include "Tools/Decode/Samples/SampleRows.h"
 #include "Tools/Decode/Samples/WideRows.h"
 #include "Tools/ExitStatus.h"
 #include "Tools/LogOverride.h"
 #include "Tools/Output.h"
 #include "Tools/Report.h"
-#include "Tools/Technologies.h"
-#include "Tools/Text/PrintableText.h"
 
 #include <algorithm>
 #include <memory>
@@ -64,22 +63,53 @@ private:
     std::optional<DecodeProgress> _progress;
 };
 
+/// Whether a file's technologies have to be known from the start.
+bool needsTechnologies(const DecodeOptions& options) {
+    return !options.technology.empty() || (options.format == DecodeOptions::Format::JsonLines &&
+                                           options.every == DecodeOptions::Every::Message);
+}
+
+/// Whether csv needs a column for the technology. Only files that can be read twice are looked at, and they
+/// make it a rule for the others as well.
+bool needsTechnologyColumn(const DecodeOptions& options) {
+    return options.format == DecodeOptions::Format::Csv && options.technology.empty() &&
+           std::any_of(options.files.begin(), options.files.end(),
+                       [](const std::string& file) { return technologiesOf(file).size() > 1; });
+}
+
+DecodingRequest requestFor(const std::string& path, const DecodeOptions& options) {
+    using Several = DecodingRequest::Several;
+    DecodingRequest request;
+    request.technology = options.technology;
+    request.messages = options.messages;
+    request.isStrict = options.isStrict;
+    const bool lacksColumn = options.format == DecodeOptions::Format::Csv && !options.hasTechnologyColumn;
+    request.several = lacksColumn && options.technology.empty() ? Several::First : Several::Decode;
+    if (needsTechnologies(options))
+        request.technologies = technologiesOf(path);
+    if (path == "-")
+        request.checkDecoder = [&options](LogGenerator& decoder) {
+            if (options.selection.paths().empty() || options.files.size() > 1)
+                return; // another file may have it
+            if (const auto problem = impossiblePath(options.selection, {&decoder.catalogue()}))
+                throw ImpossiblePath(*problem);
+        };
+    return request;
+}
+
 /// Decodes one file and prints it. Returns whether all of it was read.
 bool decodeFile(std::size_t index, const DecodeOptions& options, bool showsProgress, SampleColumns& columns,
                 Output& output) {
     const std::string& path = options.files[index];
     const std::string title = fileTitle(path);
+    DecodingRequest request = requestFor(path, options);
     const Result<std::unique_ptr<MessageReader>> reader = openMessages(path);
     if (!reader) {
         report(title + ": " + reader.reason());
         return false;
     }
-    std::string heading;
-    if (options.files.size() > 1)
-        heading = (index > 0 ? "\n== " : "== ") + printable(title) + " ==\n";
     const bool isLive = !inputSize(path);
-    const std::unique_ptr<DecodeWriter> writer =
-        DecodeWriter::make(options, path, isLive, heading, columns, output);
+    const std::unique_ptr<DecodeWriter> writer = DecodeWriter::make(options, index, isLive, columns, output);
     std::optional<ShownProgress> progress;
     if (showsProgress)
         progress.emplace(path, options);
@@ -91,54 +121,18 @@ bool decodeFile(std::size_t index, const DecodeOptions& options, bool showsProgr
         clearProgress();
         writer->flush();
     });
-    const Result<Decoded> decoded =
-        decodeMessages(**reader, {options.technology, options.range, progress ? progress->get() : nullptr},
-                       context, *writer);
+    request.progress = progress ? progress->get() : nullptr;
+    const Result<DecodedFile> decoded = decodeMessages(**reader, request, context, *writer);
     clearProgress();
     if (decoded)
-        writer->finish(*decoded);
+        for (const Decoded& technology : decoded->technologies)
+            writer->finish(technology);
     else
         report(title + ": " + decoded.reason());
+    const bool allDecoded = decoded && decoded->undecoded.report(title);
     const bool whole = reportLosses(**reader, title);
-    return decoded && whole;
+    return allDecoded && whole;
 }
-
-/// Decoders of the technologies of the files, for their catalogues. What standard input holds is not known
-/// before it is decoded.
-class Technologies {
-public:
-    explicit Technologies(const DecodeOptions& options) {
-        if (options.selection.paths().empty())
-            return;
-        if (!options.technology.empty())
-            add(options.technology);
-        else if (std::find(options.files.begin(), options.files.end(), "-") == options.files.end())
-            for (const std::string& file : options.files)
-                if (const auto reader = openMessages(file)) {
-                    static_cast<void>((*reader)->next());
-                    add((*reader)->technology());
-                }
-    }
-
-    [[nodiscard]] const std::vector<const Catalogue*>& catalogues() const { return _catalogues; }
-
-private:
-    void add(const std::string& technology) {
-        const Result<std::string> constant = technologyNamed(technology);
-        if (!constant || std::find(_names.begin(), _names.end(), *constant) != _names.end())
-            return;
-        _names.push_back(*constant);
-        if (Result<std::unique_ptr<LogGenerator>> decoder = makeDecoder(*constant, _clock)) {
-            _catalogues.push_back(&(*decoder)->catalogue());
-            _decoders.push_back(*std::move(decoder));
-        }
-    }
-
-    MachineClock _clock;
-    std::vector<std::string> _names;
-    std::vector<std::unique_ptr<LogGenerator>> _decoders;
-    std::vector<const Catalogue*> _catalogues;
-};
 
 std::string headerOf(const DecodeOptions& options, const SampleColumns& columns) {
     switch (options.samples) {
@@ -152,20 +146,25 @@ std::string headerOf(const DecodeOptions& options, const SampleColumns& columns)
 
 } // namespace
 
-int runDecode(const DecodeOptions& options, Output& output) {
-    Technologies technologies(options);
-    if (const auto problem = impossiblePath(options.selection, technologies.catalogues())) {
+int runDecode(const DecodeOptions& given, Output& output) {
+    DecodeOptions options = given;
+    options.hasTechnologyColumn = needsTechnologyColumn(options);
+    const KnownCatalogues known(options);
+    const auto problem =
+        known.areAll() ? impossiblePath(options.selection, known.catalogues()) : std::nullopt;
+    if (problem) {
         report("--select: " + *problem);
         return ExitStatus::Usage;
     }
     SampleColumns columns;
-    for (const Catalogue* const catalogue : technologies.catalogues())
+    for (const Catalogue* const catalogue : known.catalogues())
         columns.add(options.selection, *catalogue);
     if (options.format == DecodeOptions::Format::Csv)
         output.put(headerOf(options, columns));
     // Standard input that is named twice is read by one process: the second reader gets what is left.
     const std::ptrdiff_t standardInputs = std::count(options.files.begin(), options.files.end(), "-");
-    const std::size_t jobs = standardInputs > 1 ? 1 : std::min(options.jobs, options.files.size());
+    const std::size_t jobs =
+        standardInputs > 1 || !known.areAll() ? 1 : std::min(options.jobs, options.files.size());
     bool good = true;
     if (jobs > 1) {
         const Job job = [&](std::size_t index, Output& part) {
@@ -173,8 +172,13 @@ int runDecode(const DecodeOptions& options, Output& output) {
         };
         good = JobScheduler(options.files.size(), jobs, job, output).run();
     } else {
-        for (std::size_t index = 0; index < options.files.size() && output.isOpen(); ++index)
-            good = decodeFile(index, options, true, columns, output) && good;
+        try {
+            for (std::size_t index = 0; index < options.files.size() && output.isOpen(); ++index)
+                good = decodeFile(index, options, true, columns, output) && good;
+        } catch (const ImpossiblePath& impossible) {
+            report(std::string("--select: ") + impossible.what());
+            return ExitStatus::Usage;
+        }
     }
     output.flush();
     return good && output.state() != Output::State::Failed ? ExitStatus::Done : ExitStatus::BadInput;

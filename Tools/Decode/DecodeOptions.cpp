@@ -4,37 +4,24 @@
 #include "Tools/Decode/DecodeOptions.h"
 
 #include "Tools/CommandOptions.h"
-
-#include <optional>
+#include "Tools/Messages/SelectionOptions.h"
 
 namespace velmora {
 
 namespace {
-
-void addBound(CLI::App& command, const std::string& name, std::optional<TimeBound>& bound,
-              const std::string& description) {
-    command
-        .add_option_function<std::string>(
-            name,
-            [&bound](const std::string& text) {
-                if (const Result<TimeBound> read = readTimeBound(text))
-                    bound = *read;
-            },
-            description)
-        ->check(CLI::Validator(
-            [](const std::string& text) {
-                const Result<TimeBound> read = readTimeBound(text);
-                return read ? std::string() : read.reason();
-            },
-            ""))
-        ->type_name("TIME");
-}
 
 /// Refuses options that make no sense together.
 void checkTogether(const DecodeOptions& options) {
     using Format = DecodeOptions::Format;
     const bool hasSelection = !options.selection.paths().empty();
     const bool everyMessage = options.every == DecodeOptions::Every::Message;
+    if (options.messages.isWarm && !options.messages.range.from)
+        throw CLI::ValidationError("--warm", "got no --from, wanted the time from which on to write");
+    if (options.maximumAge && (everyMessage || options.samples != DecodeOptions::Samples::None ||
+                               (options.format != Format::JsonLines && options.format != Format::Csv)))
+        throw CLI::ValidationError("--max-age",
+                                   "got another output, wanted --every refresh with --format jsonl "
+                                   "or csv");
     if (options.samples != DecodeOptions::Samples::None) {
         const bool isWide = options.samples == DecodeOptions::Samples::Wide;
         if (isWide && options.format != Format::Csv)
@@ -51,9 +38,6 @@ void checkTogether(const DecodeOptions& options) {
         throw CLI::ValidationError("--format csv", "got no --select, wanted one for each column");
     if (everyMessage && options.format != Format::JsonLines && options.format != Format::Csv)
         throw CLI::ValidationError("--every message", "got another format, wanted --format jsonl or csv");
-    if (everyMessage && options.format == Format::JsonLines && hasSelection)
-        throw CLI::ValidationError(
-            "--every message", "got --select with --format jsonl, wanted it with --format csv or not at all");
 }
 
 } // namespace
@@ -100,6 +84,17 @@ CLI::App* addDecode(CLI::App& app, DecodeOptions& options) {
             "each selected leaf, a row of its own for each row of a list")
         ->needs(samples);
     command
+        ->add_option_function<double>(
+            "--max-age",
+            [&options](double seconds) {
+                options.maximumAge = std::chrono::duration_cast<std::chrono::nanoseconds>(
+                    std::chrono::duration<double>(seconds));
+            },
+            "At each refresh, leave out values that were reported longer ago: a display keeps what it shows "
+            "until something else replaces it")
+        ->check(CLI::Range(0.0, 1e9))
+        ->type_name("SECONDS");
+    command
         ->add_option_function<std::vector<std::string>>(
             "--select",
             [&options](const std::vector<std::string>& paths) { options.selection = NodeSelection(paths); },
@@ -110,9 +105,15 @@ CLI::App* addDecode(CLI::App& app, DecodeOptions& options) {
         ->allow_extra_args(false) // a FILE may follow
         ->multi_option_policy(CLI::MultiOptionPolicy::TakeAll)
         ->type_name("PATH");
-    addBound(*command, "--from", options.range.from, "Only messages at or after this time");
-    addBound(*command, "--to", options.range.to, "Only messages before this time");
+    addSelection(*command, options.messages,
+                 "; decoding starts cold: what the others leave in the display is missing");
+    command->add_flag("--warm", options.messages.isWarm,
+                      "With --from: decode from the beginning, and write from that time on what decoding "
+                      "without --from would write");
     addTechnology(*command, options.technology, "Decode as");
+    command->add_flag("--strict", options.isStrict,
+                      "End at a message that ends the application; by default it is counted, reported and "
+                      "left out");
     command->add_option("--jobs", options.jobs, "Decode this many files in parallel")
         ->check(positiveCount())
         ->type_name("N");
@@ -120,13 +121,15 @@ CLI::App* addDecode(CLI::App& app, DecodeOptions& options) {
         "With several files, text has the files' names as headings, json is one object after another,\n"
         "and jsonl and csv have the \"file\" in each line. All JSON conforms to velmora-log.schema.json.\n"
         "A csv cell without a value is empty.\n\n"
-        "A TIME is ISO 8601 (UTC unless it has a zone), seconds since 1970, or +SECONDS after the file's\n"
-        "first message.\n\n"
-        "Examples:\n"
+        "Of a file of several technologies each is decoded by itself: text and json have one display after\n"
+        "the other, and each line of jsonl and csv names its technology.\n\n" +
+        std::string(timeHelp) +
+        "\nExamples:\n"
         "  velmora-log decode drive.pcapng\n"
         "  velmora-log decode --format json drive.pcapng | jq .display\n"
         "  velmora-log decode --format jsonl --every message --from +60 --to +120 drive.pcapng\n"
         "  velmora-log decode --format csv --select '/GSM/GSM Serving Cell/RSSI' drive.pcapng > rssi.csv\n"
+        "  velmora-log decode --warm --from 2026-11-16T05:00:00Z --format jsonl drive.pcapng\n"
         "  velmora-log decode --from 2026-11-16T05:00:00Z --select /GSM drive.pcapng\n"
         "  velmora-log decode --format jsonl --jobs 4 monday/*.pcapng > monday.jsonl\n"
         "  velmora-log decode --technology Ostrel_GSM - < drive.pcapng");

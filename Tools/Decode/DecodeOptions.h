@@ -4,9 +4,11 @@
 #pragma once
 
 #include "Tools/Decode/NodeSelection.h"
-#include "Tools/Decode/TimeRange.h"
+#include "Tools/Messages/MessageSelection.h"
 
+#include <chrono>
 #include <cstddef>
+#include <optional>
 #include <string>
 #include <vector>
 
@@ -31,11 +33,16 @@ struct DecodeOptions {
     /// Observations instead of the display: none, a line for each value (JsonLines and Csv), or a row for
     /// each message (Csv).
     enum class Samples { None, Long, Wide } samples = Samples::None;
-    NodeSelection selection; ///< not empty for Csv without samples
-    TimeRange range;
-    std::string technology; ///< overrides the file's; empty for the file's
+    NodeSelection selection; ///< not empty for Csv without or with wide samples
+    /// For JsonLines and Csv at each refresh: older values are left out. Absent for no limit.
+    std::optional<std::chrono::nanoseconds> maximumAge;
+    MessageSelection messages;
+    std::string technology; ///< overrides the file's, or chooses one of several; empty for the file's
+    bool isStrict = false;  ///< a message that ends the application ends decoding as well
     std::size_t jobs = 1;   ///< how many files are decoded in parallel
     std::vector<std::string> files;
+    /// Csv rows name their technology. Not an option: it follows from the files.
+    bool hasTechnologyColumn = false;
 };
 
 /// Adds the command with its options, help and examples. Parsing fills `options`, which must outlive `app`.

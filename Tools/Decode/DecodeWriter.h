@@ -6,8 +6,8 @@
 #include "Tools/Decode/DecodeOptions.h"
 #include "Tools/Decode/Decoding.h"
 
+#include <cstddef>
 #include <memory>
-#include <string>
 
 namespace velmora {
 
@@ -17,15 +17,14 @@ class SampleColumns;
 /// What `decode` prints of a file, in one of its formats: during decoding or at its end.
 class DecodeWriter : public DecodingObserver {
 public:
-    /// The writer of the options' format. `isLive`: more may still be written to the file, as to a pipe.
-    /// `heading` goes before the text format. `columns`: those of wide samples. `options`, `columns` and
-    /// `output` must outlive it.
-    [[nodiscard]] static std::unique_ptr<DecodeWriter> make(const DecodeOptions& options,
-                                                            const std::string& file, bool isLive,
-                                                            std::string heading, SampleColumns& columns,
+    /// The writer of the options' format for the file of that index. `isLive`: more may still be written to
+    /// the file, as to a pipe. `columns`: those of wide samples. `options`, `columns` and `output` must
+    /// outlive it.
+    [[nodiscard]] static std::unique_ptr<DecodeWriter> make(const DecodeOptions& options, std::size_t index,
+                                                            bool isLive, SampleColumns& columns,
                                                             Output& output);
 
-    /// The file has been decoded to its end.
+    /// The file has been decoded to its end; called for each of its technologies.
     virtual void finish(const Decoded&) {}
     /// Writes out what is complete, and nothing else: decoding may have ended in the middle of a message.
     virtual void flush() {}

@@ -3,95 +3,14 @@
 
 #include "Tools/Decode/Decoding.h"
 
-#include "Platform/TelephonyService.h"
-#include "Tools/Decode/DecodeProgress.h"
-#include "Tools/Decode/RefreshTicks.h"
-#include "Tools/Decode/Refreshes.h"
-#include "Tools/Decode/TrackedResources.h"
+#include "Tools/Decode/FileDecoding.h"
 #include "Tools/Report.h"
-#include "Tools/Technologies.h"
-
-#include <optional>
-#include <utility>
 
 namespace velmora {
 
-Result<Decoded> decodeMessages(MessageReader& reader, const DecodingRequest& request, WorkContext& context,
-                               DecodingObserver& observer) {
-    // The first message before the technology: a file may name it no earlier than there.
-    std::optional<LoggedMessage> message = reader.next();
-    const std::string& named = request.technology.empty() ? reader.technology() : request.technology;
-    MessageClock clock;
-    const Result<std::unique_ptr<LogGenerator>> decoder = makeDecoder(named, clock);
-    if (!decoder)
-        return Failure{decoder.reason() + (named.empty() ? "; --technology supplies it" : "")};
-
-    observer.didMakeDecoder(**decoder);
-    bool keepsHistory = observer.wantsHistory(0);
-    (*decoder)->setKeepsHistory(keepsHistory);
-    const bool wantsEveryRefresh = observer.wantsEveryRefresh();
-
-    const TrackedResources resources;
-    Decoded decoded;
-    decoded.technology = shortTechnologyName(named);
-    Dictionary state;
-    Refreshes refreshes;
-    const auto refresh = [&](Time tick) {
-        refreshes.done();
-        decoded.refreshes = refreshes.count();
-        clock.setNow(tick);
-        // A refresh without a reader is skipped, unless there is no display yet: then it logs the reason.
-        if (keepsHistory || wantsEveryRefresh || !state.contains("Display"))
-            decoded.display = (*decoder)->generateLogUsingState(state);
-        observer.didRefresh(tick, decoded);
-        if (observer.wantsHistory(refreshes.count()) != keepsHistory) {
-            keepsHistory = !keepsHistory;
-            (*decoder)->setKeepsHistory(keepsHistory);
-        }
-    };
-    MessageEffects* const effects = observer.effects();
-    const Time first = message ? message->time : Time();
-    const auto decode = [&](const LoggedMessage& logged) {
-        if (request.progress)
-            request.progress->at(logged.offset);
-        if (!request.range.contains(logged.time, first)) {
-            if (const std::optional<Time> tick = refreshes.afterSkipped(logged))
-                refresh(*tick);
-            return;
-        }
-        if (const std::optional<Time> tick = refreshes.before(logged))
-            refresh(*tick);
-        context.atRecord(logged.number, logged.offset);
-        clock.setNow(logged.time);
-        observer.willDecode(logged);
-        if (effects)
-            (*decoder)->updateStateReporting(state, logged.message, *effects);
-        else
-            (*decoder)->updateState(state, logged.message);
-        ++decoded.messages;
-        observer.didDecode(logged, **decoder, state);
-        if (const std::optional<Time> tick = refreshes.after(logged))
-            refresh(*tick);
-    };
-    bool more = message.has_value();
-    if (more && !observer.isDone())
-        decode(*message);
-    message.reset(); // releases its part of the reader's buffer
-    while (more && !observer.isDone()) {
-        // Constructed in place: a move of each of millions of messages would show.
-        const std::optional<LoggedMessage> next = reader.next();
-        more = next.has_value();
-        if (more)
-            decode(*next);
-    }
-    if (const std::optional<Time> tick = refreshes.last())
-        refresh(*tick);
-    if (refreshes.count() != 0 && !keepsHistory && !wantsEveryRefresh)
-        decoded.display = (*decoder)->display(state);
-    observer.didFinish(**decoder, state);
-    if (!resources.failure().empty())
-        return Failure{"decoded without its template: " + resources.failure()};
-    return decoded;
+Result<DecodedFile> decodeMessages(MessageReader& reader, const DecodingRequest& request,
+                                   WorkContext& context, DecodingObserver& observer) {
+    return FileDecoding(reader, request, context, observer).run();
 }
 
 bool reportLosses(const MessageReader& reader, const std::string& title) {

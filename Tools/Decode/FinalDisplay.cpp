@@ -7,14 +7,26 @@
 #include "Tools/Text/JSONText.h"
 #include "Tools/Text/TreeText.h"
 
+#include <utility>
+
 namespace velmora {
 
 void FinalDisplay::finish(const Decoded& decoded) {
     if (_options.format == DecodeOptions::Format::Json)
         output().put(json(decoded, _options.selection));
     else
-        output().put(_heading + text(decoded, _options.selection));
+        output().put(heading(decoded) + text(decoded, _options.selection));
     output().flush();
+}
+
+std::string FinalDisplay::heading(const Decoded& decoded) {
+    std::string name = _title;
+    if (decoded.isOneOfSeveral)
+        name += (name.empty() ? "" : ": ") + decoded.technology;
+    if (name.empty())
+        return {};
+    const bool isFirst = std::exchange(_isFirst, false);
+    return (isFirst ? "== " : "\n== ") + name + " ==\n";
 }
 
 std::string FinalDisplay::json(const Decoded& decoded, const NodeSelection& selection) {

@@ -10,11 +10,13 @@
 
 namespace velmora {
 
-/// The display after the last message: a JSON object, or the display tree under a heading.
+/// The display after the last message: a JSON object, or the display tree. The tree has a heading where the
+/// title is not empty, and where the file holds several technologies.
 class FinalDisplay final : public DecodeWriter {
 public:
-    FinalDisplay(Output& output, const DecodeOptions& options, std::string heading)
-        : DecodeWriter(output), _options(options), _heading(std::move(heading)) {}
+    /// `isFirst`: nothing precedes the first heading.
+    FinalDisplay(Output& output, const DecodeOptions& options, std::string title, bool isFirst)
+        : DecodeWriter(output), _options(options), _title(std::move(title)), _isFirst(isFirst) {}
     [[nodiscard]] bool wantsEveryRefresh() const override { return false; }
     void finish(const Decoded& decoded) override;
 
@@ -23,8 +25,11 @@ public:
     [[nodiscard]] static std::string text(const Decoded& decoded, const NodeSelection& selection = {});
 
 private:
+    [[nodiscard]] std::string heading(const Decoded& decoded);
+
     const DecodeOptions& _options;
-    std::string _heading;
+    std::string _title;
+    bool _isFirst;
 };
 
 } // namespace velmora

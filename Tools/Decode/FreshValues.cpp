@@ -53,4 +53,20 @@ Value FreshValues::part(const Value& value, const CatalogueNode& node, Time now)
     return isFresh(node.leaf(), now) ? value : Value();
 }
 
+void AgeLimit::watch(LogGenerator& decoder) {
+    if (!_maximumAge)
+        return;
+    const Catalogue& catalogue = decoder.catalogue();
+    const auto [entry, isNew] =
+        _technologies.try_emplace(catalogue.technology(), Technology{FreshValues(*_maximumAge), &catalogue});
+    decoder.setObservationSink(&entry->second.values);
+}
+
+Value AgeLimit::fresh(const Decoded& decoded, Time now) const {
+    const auto found = _technologies.find(decoded.technology);
+    return found == _technologies.end()
+               ? decoded.display
+               : found->second.values.of(decoded.display, *found->second.catalogue, now);
+}
+
 } // namespace velmora

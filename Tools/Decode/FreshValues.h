@@ -6,9 +6,13 @@
 #include "LogGenerator/Observations/Observation.h"
 #include "Platform/Clock.h"
 #include "PropertyLists/Value.h"
+#include "Tools/Decode/Decoding.h"
 
 #include <chrono>
+#include <functional>
+#include <map>
 #include <optional>
+#include <string>
 #include <vector>
 
 namespace velmora {
@@ -21,8 +25,8 @@ public:
 
     void observed(const ObservedMessage& message) override;
 
-    /// The parts of the display that are at most that old: an empty list or dictionary where nothing of it is.
-    /// None of no display. Shares with the display what is fresh as a whole.
+    /// The parts of the display that are at most that old: an empty list or dictionary where nothing of it
+    /// is. None of no display. Shares with the display what is fresh as a whole.
     [[nodiscard]] Value of(const Value& display, const Catalogue& catalogue, Time now) const;
 
 private:
@@ -31,6 +35,27 @@ private:
 
     std::chrono::nanoseconds _maximumAge;
     std::vector<std::optional<Time>> _latest; ///< by the leaf's index in its catalogue
+};
+
+/// The limit for the age of what a file's displays show, technology by technology.
+class AgeLimit {
+public:
+    /// Absent: there is no limit, and nothing is observed.
+    explicit AgeLimit(std::optional<std::chrono::nanoseconds> maximumAge) : _maximumAge(maximumAge) {}
+
+    /// Observes the decoder's messages, which must not outlive this.
+    void watch(LogGenerator& decoder);
+    /// What of the display is fresh at that time.
+    [[nodiscard]] Value fresh(const Decoded& decoded, Time now) const;
+
+private:
+    struct Technology {
+        FreshValues values;
+        const Catalogue* catalogue;
+    };
+
+    std::optional<std::chrono::nanoseconds> _maximumAge;
+    std::map<std::string, Technology, std::less<>> _technologies; ///< by their short names
 };
 
 } // namespace velmora

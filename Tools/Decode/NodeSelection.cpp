@@ -194,6 +194,20 @@ Value NodeSelection::restricted(const Value& display) const {
     return selectsAll() ? display : restrictedAfter(display, Rests(_paths.begin(), _paths.end()), true);
 }
 
+Value NodeSelection::restrictedAt(const CatalogueNode& place, const Value& value) const {
+    if (selectsAll())
+        return value;
+    Rests inside;
+    for (const std::string& each : _paths) {
+        const std::optional<std::string_view> left = PathPattern::below(each, place);
+        if (left && left->empty())
+            return value;
+        if (left)
+            inside.push_back(*left);
+    }
+    return inside.empty() ? Value() : restrictedAfter(value, inside, false);
+}
+
 NodeRef NodeSelection::restricted(const NodeRef& root) const {
     return selectsAll() ? root : restrictedAfter(*root, Rests(_paths.begin(), _paths.end()), true);
 }

@@ -3,6 +3,7 @@
 
 #pragma once
 
+#include "LogGenerator/Observations/Catalogue.h"
 #include "Model/VelmoraModelNode.h"
 #include "PropertyLists/Value.h"
 
@@ -29,6 +30,9 @@ public:
     [[nodiscard]] const std::vector<std::string>& paths() const { return _paths; }
     /// What a column of each path is called: its name, or the path itself.
     [[nodiscard]] const std::vector<std::string>& names() const { return _names; }
+
+    /// The same of a part of a display: the value of that place.
+    [[nodiscard]] Value restrictedAt(const CatalogueNode& place, const Value& value) const;
 
     /// The value of the node at the path; null where there is none. Belongs to the display.
     [[nodiscard]] static const Value* find(const Value& display, std::string_view path);

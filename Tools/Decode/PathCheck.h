@@ -7,6 +7,7 @@
 #include "Tools/Decode/NodeSelection.h"
 
 #include <optional>
+#include <stdexcept>
 #include <string>
 #include <vector>
 
@@ -17,5 +18,11 @@ namespace velmora {
 /// nothing is wrong.
 [[nodiscard]] std::optional<std::string> impossiblePath(const NodeSelection& selection,
                                                         const std::vector<const Catalogue*>& catalogues);
+
+/// Raised where that is found out after decoding has begun, since standard input names its technology there.
+class ImpossiblePath : public std::runtime_error {
+public:
+    using std::runtime_error::runtime_error;
+};
 
 } // namespace velmora

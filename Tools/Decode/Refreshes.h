@@ -6,6 +6,7 @@
 #include "Platform/Clock.h"
 #include "Recording/MessageReader.h"
 #include "Tools/Decode/RefreshTicks.h"
+#include "Tools/Messages/MessageSelection.h"
 
 #include <cstdint>
 #include <optional>
@@ -20,7 +21,12 @@ public:
     [[nodiscard]] std::optional<Time> before(const LoggedMessage& message) {
         _fileHasRefreshes = _fileHasRefreshes || message.refresh;
         const std::optional<Time> tick = _ticks.tickBefore(message.time);
-        return tick && !_fileHasRefreshes ? tick : std::nullopt;
+        // Without a message since the last one there is nothing to show, as after a refresh by `by`.
+        return tick && _isPending && !_fileHasRefreshes ? tick : std::nullopt;
+    }
+    /// The refresh that is due by this time, if any, whether or not a message follows.
+    [[nodiscard]] std::optional<Time> by(Time time) {
+        return _isPending && !_fileHasRefreshes ? _ticks.tickBefore(time) : std::nullopt;
     }
     /// The message is skipped without being decoded: the refresh that is due after it, if any.
     [[nodiscard]] std::optional<Time> afterSkipped(const LoggedMessage& message) {
@@ -49,7 +55,9 @@ private:
     std::uint64_t _count = 0;
 };
 
-/// How many refreshes decoding all messages takes, from the reader's position to its end.
-[[nodiscard]] std::uint64_t countRefreshes(MessageReader& reader);
+/// How many refreshes decoding the selected messages of a file takes, of which nothing has been read: those
+/// of its technology, or of the one of that index.
+[[nodiscard]] std::uint64_t countRefreshes(MessageReader& reader, const MessageSelection& messages,
+                                           std::optional<std::uint32_t> technology);
 
 } // namespace velmora

@@ -2,9 +2,8 @@
 // SPDX-License-Identifier: MIT
 
 #include "Platform/Linux/LoopTimer.h"
-#include "PropertyLists/PropertyList.h"
 #include "Recording/OpenMessages.h"
-#include "Tests/Tools/ToolFixture.h"
+#include "Tests/Tools/Convert/ConvertFixture.h"
 
 #include <gmock/gmock.h>
 
@@ -22,53 +21,7 @@ namespace {
 using testing::ElementsAre;
 using testing::HasSubstr;
 
-class ConvertCommandTest : public ToolTest {
-protected:
-    ConvertCommandTest() {
-        writeRecording("drive.pcapng", "Ostrel_GSM", _drive);
-        std::filesystem::create_directory(path("out"));
-    }
-
-    /// Runs `velmora-log convert` and returns its messages; checks its exit status.
-    std::string convert(std::vector<std::string> arguments, int status,
-                        std::optional<std::string> input = std::nullopt) {
-        arguments.insert(arguments.begin(), "convert");
-        ToolProcess::Setup setup = tool(std::move(arguments));
-        setup.input = std::move(input);
-        ToolProcess process(setup);
-        EXPECT_EQ(process.exitStatus(), status) << process.errors();
-        EXPECT_EQ(process.output(), "");
-        return ownMessages(process.errors());
-    }
-    /// What is in the directory that the tests write to.
-    [[nodiscard]] std::vector<std::string> outputs() const {
-        std::vector<std::string> names;
-        for (const auto& entry : std::filesystem::directory_iterator(_directory / "out"))
-            names.push_back(entry.path().filename().string());
-        return names;
-    }
-    [[nodiscard]] std::vector<Data> messagesOf(const std::string& name) const {
-        std::vector<Data> messages;
-        const auto reader = openMessages(path(name));
-        if (!reader) {
-            ADD_FAILURE() << reader.reason();
-            return messages;
-        }
-        while (const auto message = (*reader)->next())
-            messages.push_back(Data::copyOf(message->message.bytes()));
-        EXPECT_EQ((*reader)->lossTotals().losses, 0U);
-        return messages;
-    }
-    [[nodiscard]] Value snapshot(const std::string& name) const {
-        const std::string text = contentOf(name);
-        const auto list =
-            readPropertyList(Bytes(reinterpret_cast<const std::uint8_t*>(text.data()), text.size()));
-        return list ? *list : Value();
-    }
-
-    const std::vector<TimedMessage> _drive = {
-        {at(0), rrState(4)}, {at(500), record(0x4125, "03")}, {at(4100), rrState(5)}};
-};
+class ConvertCommandTest : public ConvertTest {};
 
 TEST_F(ConvertCommandTest, RecordingIsMadeTheSameAgain) {
     EXPECT_EQ(convert({path("drive.pcapng"), path("out/copy.pcapng")}, 0), "");
@@ -251,7 +204,7 @@ TEST_F(ConvertCommandTest, TechnologyIsTheUsersBeforeTheFiles) {
 TEST_F(ConvertCommandTest, MessageThatEndsADecoderLeavesWhatWasThere) {
     writeRecording("ifx.pcapng", "IFX", {{at(0), hex("01 02 03")}});
     std::ofstream(path("out/ifx.velmora")) << "an earlier one";
-    EXPECT_THAT(convert({"--force", path("ifx.pcapng"), path("out/ifx.velmora")}, 1),
+    EXPECT_THAT(convert({"--strict", "--force", path("ifx.pcapng"), path("out/ifx.velmora")}, 1),
                 HasSubstr("Could not deserialize the object"));
     EXPECT_EQ(contentOf("out/ifx.velmora"), "an earlier one");
     EXPECT_THAT(outputs(), ElementsAre("ifx.velmora"));

@@ -93,10 +93,11 @@ TEST_F(DecodeLinesTest, SelectionRestrictsEveryFormat) {
     EXPECT_EQ(decode({"--select", "/Nothing", path("a.pcapng")}), "");
 }
 
-TEST_F(DecodeLinesTest, LinesBeforeADecoderFailureAreComplete) {
+TEST_F(DecodeLinesTest, LinesBeforeADecoderEndsAreComplete) {
     const std::vector<std::uint64_t> offsets = writeRecording(
         "sim.pcapng", "Ostrel_GSM", {{at(0), rrState(5)}, {at(1), record(0x0000, "DE AD BE EF", 0xFF)}});
-    ToolProcess process(tool({"decode", "--format", "jsonl", "--every", "message", path("sim.pcapng")}));
+    ToolProcess process(
+        tool({"decode", "--strict", "--format", "jsonl", "--every", "message", path("sim.pcapng")}));
     EXPECT_EQ(process.exitStatus(), 1);
     EXPECT_EQ(process.output(),
               R"({"time":"2026-11-16T05:00:00.000000000Z","code":20780,"sections":{"GSM RR Info":{)"

@@ -92,9 +92,10 @@ protected:
         reader.refreshes = std::move(told);
         WorkContext context("test");
         Observer observer;
-        const Result<Decoded> decoded = decodeMessages(reader, {{}, range}, context, observer);
+        const Result<DecodedFile> decoded =
+            decodeMessages(reader, {{}, {range, false, {}}}, context, observer);
         EXPECT_TRUE(decoded);
-        EXPECT_EQ(decoded->messages, observer.messages);
+        EXPECT_EQ(decoded->technologies.front().messages, observer.messages);
         return observer.refreshes;
     }
 
@@ -189,9 +190,9 @@ TEST_F(DecodingTest, RestIsLeftUndoneOnceThereIsEnough) {
     WorkContext context("test");
     Observer observer;
     observer.mostMessages = 2;
-    const Result<Decoded> decoded = decodeMessages(reader, {}, context, observer);
+    const Result<DecodedFile> decoded = decodeMessages(reader, {}, context, observer);
     ASSERT_TRUE(decoded);
-    EXPECT_EQ(decoded->messages, 2U);
+    EXPECT_EQ(decoded->technologies.front().messages, 2U);
     EXPECT_THAT(observer.refreshes, ElementsAre(Refresh{at(2000), "RR_IDLE"}));
 }
 
@@ -199,22 +200,22 @@ TEST_F(DecodingTest, WithoutMessagesNothingIsRefreshedAndNothingShown) {
     ListReader reader("Ostrel_GSM", {});
     WorkContext context("test");
     Observer observer;
-    const Result<Decoded> decoded = decodeMessages(reader, {}, context, observer);
+    const Result<DecodedFile> decoded = decodeMessages(reader, {}, context, observer);
     ASSERT_TRUE(decoded);
     EXPECT_THAT(observer.refreshes, IsEmpty());
-    EXPECT_EQ(decoded->technology, "Ostrel_GSM");
-    EXPECT_TRUE(decoded->display.isNone());
-    EXPECT_EQ(FinalDisplay::text(*decoded), "");
+    EXPECT_EQ(decoded->technologies.front().technology, "Ostrel_GSM");
+    EXPECT_TRUE(decoded->technologies.front().display.isNone());
+    EXPECT_EQ(FinalDisplay::text(decoded->technologies.front()), "");
 }
 
 TEST_F(DecodingTest, TechnologyIsShownInShort) {
     ListReader reader("", {{at(0), rrState(5)}});
     WorkContext context("test");
     Observer observer;
-    const Result<Decoded> decoded =
+    const Result<DecodedFile> decoded =
         decodeMessages(reader, {"kVoxLogChannelTechnology_Ostrel_GSM", {}}, context, observer);
     ASSERT_TRUE(decoded);
-    EXPECT_EQ(FinalDisplay::json(*decoded), R"({
+    EXPECT_EQ(FinalDisplay::json(decoded->technologies.front()), R"({
   "technology": "Ostrel_GSM",
   "messages": 1,
   "display": {

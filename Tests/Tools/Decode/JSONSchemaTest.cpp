@@ -7,7 +7,9 @@
 
 #include <gmock/gmock.h>
 
+#include <fstream>
 #include <string>
+#include <utility>
 #include <vector>
 
 // All JSON that velmora-log writes, of drives of all technologies, against the schema that is published.
@@ -87,6 +89,30 @@ TEST_P(TechnologyJSONTest, AllOfItKeepsToTheSchema) {
             EXPECT_GT(std::atoi(objects.c_str()), 1) << objects;
         else
             EXPECT_EQ(objects, row.objects) << kind.name << testing::PrintToString(row.arguments);
+    }
+}
+
+TEST_F(JSONSchemaTest, FileOfAllTechnologiesKeepsToTheSchema) {
+    std::string all;
+    for (const ScenarioKind& kind : scenarioKinds()) {
+        writeDrive(kind, 50);
+        all += contentOf(std::string(kind.name) + ".pcapng"); // a section each
+    }
+    std::ofstream(path("all.pcapng"), std::ios::binary) << all;
+    const std::string messages = std::to_string(5 * 50 + 4 * 4) + "\n";
+    for (const auto& [arguments, objects] :
+         {std::pair<std::vector<std::string>, std::string>{{"--format", "json"}, "5\n"},
+          {{"--format", "jsonl", "--every", "message"}, messages},
+          {{"--format", "jsonl", "--from", "+1"}, ""}}) {
+        std::vector<std::string> words = {"decode", path("all.pcapng")};
+        words.insert(words.end(), arguments.begin(), arguments.end());
+        ToolProcess process(shipped(words));
+        ASSERT_TRUE(process.exitStatus());
+        const std::string checked = check(process.output());
+        if (objects.empty())
+            EXPECT_GT(std::atoi(checked.c_str()), 5) << checked;
+        else
+            EXPECT_EQ(checked, objects) << testing::PrintToString(arguments);
     }
 }
 

@@ -36,7 +36,8 @@ void SampleColumns::add(const NodeSelection& selection, const Catalogue& catalog
                 title = name + "/" + leaf->node->name();
             _columns.push_back({titleOf(title, *leaf), leaf->path, path});
         }
-        if (leaves.empty() && !contains(path, {}))
+        // A tree that names its own leaves may have it.
+        if (leaves.empty() && pattern.isPossible(catalogue) && !contains(path, {}))
             _columns.push_back({selection.names()[path], {}, path});
     }
 }

@@ -42,15 +42,31 @@ void appendCsvValue(TextBuffer& out, const Observation& observation) {
     case ObservedKind::Enumeration: append(out, observation.raw, 10); break;
     case ObservedKind::Flag: out.append(observation.raw != 0 ? "true" : "false"); break;
     case ObservedKind::Text: appendCsvText(out, observation.words); break;
-    case ObservedKind::Binary:
-        for (const std::uint8_t byte : observation.bytes) {
-            constexpr char digits[] = "0123456789abcdef";
-            out.append(digits[byte >> 4]);
-            out.append(digits[byte & 0xF]);
-        }
-        break;
+    case ObservedKind::Binary: appendHexadecimal(out, observation.bytes); break;
     case ObservedKind::Absent: break;
     }
+}
+
+void appendHexadecimal(TextBuffer& out, Bytes bytes) {
+    constexpr char digits[] = "0123456789abcdef";
+    for (const std::uint8_t byte : bytes) {
+        out.append(digits[byte >> 4]);
+        out.append(digits[byte & 0xF]);
+    }
+}
+
+std::string csvBeginning(const DecodeOptions& options) {
+    return std::string("time") + (options.files.size() > 1 ? ",file" : "") +
+           (options.hasTechnologyColumn ? ",technology" : "");
+}
+
+std::string csvCellOfFile(const std::string& file) {
+    if (file.empty())
+        return {};
+    TextBuffer cell;
+    cell.append(',');
+    appendCsvText(cell, file);
+    return std::string(cell.view());
 }
 
 void appendLogCode(TextBuffer& out, std::optional<std::uint32_t> code) {

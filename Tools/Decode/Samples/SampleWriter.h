@@ -8,9 +8,14 @@
 #include "Tools/Decode/Samples/SelectedLeaves.h"
 #include "Tools/Text/LineWriter.h"
 
+#include <cstddef>
+#include <cstdint>
+#include <functional>
+#include <map>
 #include <optional>
 #include <string>
 #include <utility>
+#include <vector>
 
 namespace velmora {
 
@@ -19,24 +24,36 @@ namespace velmora {
 class SampleWriter : public LineWriter, private ObservationSink {
 public:
     void didMakeDecoder(LogGenerator& decoder) override;
+    void willConcern(const Decoded& decoded) override;
     void willDecode(const LoggedMessage& message) override;
     [[nodiscard]] bool wantsEveryRefresh() const override { return false; }
-    void didRefresh(Time, const Decoded&) override {}
     void didDecode(const LoggedMessage& message, LogGenerator& decoder, Dictionary& state) override;
+    void didRefresh(Time, const Decoded&) override {}
 
 protected:
-    SampleWriter(Output& output, bool isLive, const DecodeOptions& options, const std::string& file);
+    /// What is kept of a technology of the file: leaves have their numbers in its catalogue alone.
+    struct Technology {
+        explicit Technology(const NodeSelection& selection, LeafTexts::Form form)
+            : selected(selection), leaves(selection, form) {}
+
+        std::string text; ///< the technology, as lines show it; empty where they do not
+        SelectedLeaves selected;
+        LeafTexts leaves;
+        std::vector<std::vector<std::size_t>> columns; ///< by leaf and path
+    };
+
+    SampleWriter(Output& output, bool isLive, const DecodeOptions& options, LeafTexts::Form form);
 
     /// A message's observations.
     virtual void write(const ObservedMessage& message) = 0;
+    /// The technology as lines show it.
+    [[nodiscard]] virtual std::string textOf(const Decoded& decoded) const = 0;
 
     [[nodiscard]] const DecodeOptions& options() const { return _options; }
-    [[nodiscard]] SelectedLeaves& selected() { return _selected; }
-    /// Empty where there is one file.
-    [[nodiscard]] const std::string& file() const { return _file; }
-    [[nodiscard]] Time arrival() const { return _arrival; }
+    /// That of the message.
+    [[nodiscard]] Technology& technology() { return *_technology; }
     [[nodiscard]] std::uint64_t record() const { return _record; }
-    /// The message's own time stamp as a time; absent where it has none or a wrong one.
+    /// The message's own time stamp as a time; absent where it has none or an invalid one.
     [[nodiscard]] static std::optional<Time> modemTime(const ObservedMessage& message);
 
 private:
@@ -46,44 +63,12 @@ private:
     }
 
     const DecodeOptions& _options;
-    SelectedLeaves _selected;
-    std::string _file;
+    LeafTexts::Form _form;
+    std::map<std::string, Technology, std::less<>> _technologies; ///< by their short names
+    Technology* _technology = nullptr;
     bool _isLive;
     bool _isWanted = false; ///< the message that is being decoded
-    Time _arrival{};
     std::uint64_t _record = 0;
-};
-
-/// One JSON object a line for each observed value.
-class SampleLines final : public SampleWriter {
-public:
-    SampleLines(Output& output, bool isLive, const DecodeOptions& options, const std::string& file);
-
-private:
-    void write(const ObservedMessage& message) override;
-    void appendValue(const Observation& observation);
-
-    LeafTexts _leaves;
-    ObservedText _text;
-    std::string _begin;
-    TextBuffer _head; ///< what the lines of the message have in common, before the path
-    TextBuffer _tail; ///< and after the text
-};
-
-/// Comma-separated values, a row for each observed value.
-class SampleRows final : public SampleWriter {
-public:
-    SampleRows(Output& output, bool isLive, const DecodeOptions& options, const std::string& file);
-    [[nodiscard]] static std::string header(const DecodeOptions& options);
-
-private:
-    void write(const ObservedMessage& message) override;
-
-    LeafTexts _leaves;
-    ObservedText _text;
-    std::string _fileCell;
-    TextBuffer _head; ///< what the rows of the message have in common, before the path
-    TextBuffer _tail; ///< and after the text
 };
 
 } // namespace velmora

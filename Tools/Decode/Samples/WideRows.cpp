@@ -23,18 +23,12 @@ bool areSameRow(const Observation& a, const Observation& b) {
 
 WideRows::WideRows(Output& output, bool isLive, const DecodeOptions& options, const std::string& file,
                    SampleColumns& columns)
-    : SampleWriter(output, isLive, options, file), _columns(columns) {
-    if (file.empty())
-        return;
-    TextBuffer cell;
-    cell.append(',');
-    appendCsvText(cell, file);
-    _fileCell = cell.view();
-}
+    : SampleWriter(output, isLive, options, LeafTexts::Form::CSV), _columns(columns),
+      _fileCell(csvCellOfFile(file)) {}
 
 std::string WideRows::header(const DecodeOptions& options, const SampleColumns& columns) {
     TextBuffer row;
-    row.append(options.files.size() > 1 ? "time,file" : "time");
+    row.append(csvBeginning(options));
     row.append(",modem_time,code,record");
     if (columns.hasRows())
         row.append(",row");
@@ -44,6 +38,10 @@ std::string WideRows::header(const DecodeOptions& options, const SampleColumns& 
     }
     row.append(csvRowEnd);
     return std::string(row.view());
+}
+
+std::string WideRows::textOf(const Decoded& decoded) const {
+    return options().hasTechnologyColumn ? "," + decoded.technology : std::string();
 }
 
 void WideRows::didMakeDecoder(LogGenerator& decoder) {
@@ -63,7 +61,7 @@ void WideRows::write(const ObservedMessage& message) {
         for (const Observation& observation : message.observations) {
             if (observation.rows.empty() == inLists)
                 continue;
-            for (const SelectedLeaves::Choice& choice : selected().of(*observation.leaf)) {
+            for (const SelectedLeaves::Choice& choice : technology().selected.of(*observation.leaf)) {
                 const std::size_t column =
                     isInRows(observation, choice.rows) ? columnOf(observation, choice) : noColumn;
                 if (column == noColumn)
@@ -84,8 +82,9 @@ void WideRows::write(const ObservedMessage& message) {
 }
 
 void WideRows::writeRow(const ObservedMessage& message, const Observation& first) {
-    appendTime(arrival());
+    appendTime(message.arrival);
     line().append(_fileCell);
+    line().append(technology().text);
     line().append(',');
     if (const std::optional<Time> own = modemTime(message))
         appendTime(*own);
@@ -111,11 +110,12 @@ void WideRows::writeRow(const ObservedMessage& message, const Observation& first
 
 std::size_t WideRows::columnOf(const Observation& observation, const SelectedLeaves::Choice& choice) {
     const std::size_t leaf = observation.leaf->index;
-    while (_columnsOfLeaves.size() <= leaf)
-        _columnsOfLeaves.emplace_back();
-    std::vector<std::size_t>& columns = _columnsOfLeaves[leaf];
+    std::vector<std::vector<std::size_t>>& all = technology().columns;
+    while (all.size() <= leaf)
+        all.emplace_back();
+    std::vector<std::size_t>& columns = all[leaf];
     if (columns.empty()) {
-        columns.assign(selected().patterns().size(), noColumn);
+        columns.assign(technology().selected.patterns().size(), noColumn);
         for (std::size_t i = 0; i < _columns.columns().size(); ++i) {
             const SampleColumns::Column& column = _columns.columns()[i];
             if (columns[column.path] == noColumn &&

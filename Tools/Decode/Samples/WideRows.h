@@ -27,13 +27,13 @@ private:
     static constexpr std::size_t noColumn = ~std::size_t{0};
 
     void write(const ObservedMessage& message) override;
+    [[nodiscard]] std::string textOf(const Decoded& decoded) const override;
     void writeRow(const ObservedMessage& message, const Observation& first);
     /// The column of the observation; `noColumn` for none.
     [[nodiscard]] std::size_t columnOf(const Observation& observation, const SelectedLeaves::Choice& choice);
 
     SampleColumns& _columns;
-    std::vector<std::vector<std::size_t>> _columnsOfLeaves; ///< by leaf and path
-    std::vector<const Observation*> _cells;                 ///< of the row that is being made
+    std::vector<const Observation*> _cells; ///< of the row that is being made
     std::string _fileCell;
 };
 

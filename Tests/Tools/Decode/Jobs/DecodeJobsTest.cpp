@@ -61,12 +61,12 @@ TEST_F(DecodeJobsTest, JobsGoWithoutADirectoryForTemporaryFiles) {
     EXPECT_TRUE(side.output() == serial.output());
 }
 
-TEST_F(DecodeJobsTest, JobThatADecoderEndsEndsThoseAfterIt) {
+TEST_F(DecodeJobsTest, StrictJobThatADecoderEndsEndsThoseAfterIt) {
     writeDrive("a.pcapng");
     const std::vector<std::uint64_t> offsets =
         writeRecording("sim.pcapng", "Ostrel_GSM", {{at(0), record(0x0000, "DE AD BE EF", 0xFF)}});
-    ToolProcess process(tool({"decode", "--jobs", "3", "--log-level", "0", "--format", "csv", "--select", "/",
-                              path("a.pcapng"), path("sim.pcapng"), path("a.pcapng")}));
+    ToolProcess process(tool({"decode", "--strict", "--jobs", "3", "--log-level", "0", "--format", "csv",
+                              "--select", "/", path("a.pcapng"), path("sim.pcapng"), path("a.pcapng")}));
     EXPECT_EQ(process.exitStatus(), 1);
     EXPECT_THAT(process.output(), StartsWith("time,file,/\r\n2026-11-16T05:00:02.000000000Z," +
                                              path("a.pcapng") + ",\"{\"\"GSM RR Info"));
@@ -74,6 +74,32 @@ TEST_F(DecodeJobsTest, JobThatADecoderEndsEndsThoseAfterIt) {
     EXPECT_EQ(ownMessages(process.errors()), "velmora-log: " + path("sim.pcapng") + ": record 1 at offset " +
                                                  std::to_string(offsets[0]) +
                                                  ": SIM File dictionary data could not be constructed\n");
+}
+
+TEST_F(DecodeJobsTest, JobWithAMessageThatIsNotDecodedLetsTheOthersBeDone) {
+    writeDrive("a.pcapng");
+    const std::vector<std::uint64_t> offsets = writeRecording(
+        "sim.pcapng", "Ostrel_GSM", {{at(0), record(0x0000, "DE AD BE EF", 0xFF)}, {at(1), rrState(5)}});
+    for (const char* jobs : {"1", "3"}) {
+        ToolProcess process(
+            tool({"decode", "--jobs", jobs, "--log-level", "0", "--format", "csv", "--select",
+                  "/GSM RR Info/RR State", path("a.pcapng"), path("sim.pcapng"), path("a.pcapng")}));
+        EXPECT_EQ(process.exitStatus(), 1);
+        const auto row = [this](const char* time, const char* file, const char* state) {
+            return std::string("2026-11-16T05:00:0") + time + ".000000000Z," + path(file) + "," + state +
+                   "\r\n";
+        };
+        const std::string a =
+            row("2", "a.pcapng", "RR_PLMN_LIST_CONSTRUCTION") + row("4", "a.pcapng", "RR_IDLE");
+        EXPECT_EQ(process.output(),
+                  "time,file,/GSM RR Info/RR State\r\n" + a + row("2", "sim.pcapng", "RR_IDLE") + a);
+        EXPECT_EQ(ownMessages(process.errors()), "velmora-log: " + path("sim.pcapng") +
+                                                     ": record 1 at offset " + std::to_string(offsets[0]) +
+                                                     ": SIM File dictionary data could not be constructed\n"
+                                                     "velmora-log: " +
+                                                     path("sim.pcapng") +
+                                                     ": 1 message could not be decoded\n");
+    }
 }
 
 TEST_F(DecodeJobsTest, StandardInputTwiceIsReadInTurn) {

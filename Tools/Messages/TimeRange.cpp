@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Tools/Decode/TimeRange.h"
+#include "Tools/Messages/TimeRange.h"
 
 #include "Platform/DateText.h"
 
