@@ -127,7 +127,7 @@ protected:
         return nullptr;
     }
 
-    /// "Record 0x5137: 2 of 3 entries", where the record holds fewer than its count announces.
+    /// "Record 0x5137: 2 of 3 entries", where the record holds fewer than its count.
     static void reportMissingEntries(const CountedList& list, std::uint32_t logCode);
     /// The same for a list whose entries' lengths differ: `complete` of `count` lie inside the record.
     static void reportMissingEntries(std::size_t complete, std::size_t count, std::uint32_t logCode);

@@ -86,6 +86,9 @@ using velmora::failing::failsFor;
 
 extern "C" {
 
+// The names that the C library gives the parameters say little.
+// NOLINTBEGIN(readability-inconsistent-declaration-parameter-name)
+
 void* malloc(std::size_t size) {
     return failsFor(__builtin_return_address(0)) ? nullptr : __libc_malloc(size);
 }
@@ -113,6 +116,8 @@ int posix_memalign(void** memory, std::size_t alignment, std::size_t size) {
     *memory = made;
     return 0;
 }
+
+// NOLINTEND(readability-inconsistent-declaration-parameter-name)
 
 } // extern "C"
 

@@ -31,7 +31,7 @@ public:
 
     Listener(std::string name, const std::vector<std::uint32_t>& codes) : _name(std::move(name)) {
         for (const std::uint32_t code : codes)
-            _views.push_back({code, std::size_t{0}});
+            _views.emplace_back(code, std::size_t{0});
     }
     [[nodiscard]] std::string_view getSectionName() const override { return _name; }
     [[nodiscard]] std::span<const View> views() const override { return _views; }

@@ -17,7 +17,7 @@ constexpr const char* bold = "\x1b[1m";
 constexpr const char* reverse = "\x1b[7m";
 constexpr const char* plain = "\x1b[0m";
 
-/// Columns grow in such steps, so that a value which gains a digit does not move the whole screen.
+/// Columns grow in such steps, so that a value which gains a digit does not move the entire screen.
 constexpr std::size_t widthStep = 8;
 
 std::string statusLine(std::string_view status, const ScreenLayout& layout, std::size_t scroll,

@@ -78,7 +78,7 @@ TEST(OneXSubPacketsTest, EveryPrefix) {
     }
 }
 
-/// A record whose last sub-packet is taken although it is not whole.
+/// A record whose last sub-packet is taken although it is incomplete.
 struct Cut {
     const char* name;
     std::vector<Data> subPackets;
