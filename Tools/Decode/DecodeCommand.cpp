@@ -10,6 +10,7 @@
 #include "Tools/Decode/DecodeWriter.h"
 #include "Tools/Decode/Jobs/JobScheduler.h"
 #include "Tools/ExitStatus.h"
+#include "Tools/Log/DecoderLog.h"
 #include "Tools/LogOverride.h"
 #include "Tools/Output.h"
 #include "Tools/Report.h"
@@ -59,7 +60,8 @@ private:
 };
 
 /// Decodes one file and prints it. Returns whether all of it was read.
-bool decodeFile(std::size_t index, const DecodeOptions& options, bool showsProgress, Output& output) {
+bool decodeFile(std::size_t index, const DecodeOptions& options, bool showsProgress, DecoderLines& lines,
+                Output& output) {
     const std::string& path = options.files[index];
     const std::string title = fileTitle(path);
     const Result<std::unique_ptr<MessageReader>> reader = openMessages(path);
@@ -79,10 +81,14 @@ bool decodeFile(std::size_t index, const DecodeOptions& options, bool showsProgr
         if (progress)
             progress->clear();
     };
+    const auto sumUp = [&] { lines.report(options.files.size() > 1 ? printable(title) : std::string()); };
     WorkContext context(title, [&] {
         clearProgress();
         writer->flush();
+        sumUp();
     });
+    // Over the progress line, which only lines that are written replace.
+    const DecoderLog log(lines);
     const Result<Decoded> decoded =
         decodeMessages(**reader, {options.technology, options.range, progress ? progress->get() : nullptr},
                        context, *writer);
@@ -92,12 +98,13 @@ bool decodeFile(std::size_t index, const DecodeOptions& options, bool showsProgr
     else
         report(title + ": " + decoded.reason());
     const bool whole = reportLosses(**reader, title);
+    sumUp();
     return decoded && whole;
 }
 
 } // namespace
 
-int runDecode(const DecodeOptions& options, Output& output) {
+int runDecode(const DecodeOptions& options, DecoderLines& lines, Output& output) {
     if (options.format == DecodeOptions::Format::Csv)
         output.put(CSVRows::header(options));
     // Standard input that is named twice is read by one process: the second reader gets what is left.
@@ -106,12 +113,12 @@ int runDecode(const DecodeOptions& options, Output& output) {
     bool good = true;
     if (jobs > 1) {
         const Job job = [&](std::size_t index, Output& part) {
-            return decodeFile(index, options, false, part);
+            return decodeFile(index, options, false, lines, part);
         };
         good = JobScheduler(options.files.size(), jobs, job, output).run();
     } else {
         for (std::size_t index = 0; index < options.files.size() && output.isOpen(); ++index)
-            good = decodeFile(index, options, true, output) && good;
+            good = decodeFile(index, options, true, lines, output) && good;
     }
     output.flush();
     return good && output.state() != Output::State::Failed ? ExitStatus::Done : ExitStatus::BadInput;
