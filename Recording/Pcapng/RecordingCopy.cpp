@@ -6,6 +6,7 @@
 #include "Platform/TelephonyService.h"
 #include "Recording/Pcapng/InterfaceDescription.h"
 #include "Recording/Pcapng/Pcapng.h"
+#include "Recording/Pcapng/PcapngBlocks.h"
 #include "Recording/Pcapng/PcapngCopy.h"
 
 #include <system_error>
@@ -31,31 +32,41 @@ Result<Done> RecordingCopy::addMessage() {
 }
 
 Result<Done> RecordingCopy::finish() {
+    add({});
+    if (!_hasInterface && !_technology.empty())
+        pcapngBlocks::appendInterface(_buffer, _technology);
     flush();
     return _failure ? Result<Done>(*_failure) : Done{};
 }
 
 void RecordingCopy::addOther(const PcapngReader::Block& block) {
-    if (block.type == pcapng::BlockType::SectionHeader)
+    if (block.type == pcapng::BlockType::SectionHeader) {
+        _hasSection = true;
         add(pcapngCopy::sectionHeader(block));
-    else if (block.type == pcapng::BlockType::InterfaceDescription && isRenamed(block))
+    } else if (block.type == pcapng::BlockType::InterfaceDescription) {
+        addInterface(block);
+    } else if (pcapngCopy::mayBeCopied(block)) {
+        add(block.bytes);
+    }
+}
+
+void RecordingCopy::addInterface(const PcapngReader::Block& block) {
+    const auto interface = InterfaceDescription::read(block.body(), block.bigEndian);
+    const bool isOfMessages = interface && interface->linkType == pcapng::logMessageLinkType;
+    _hasInterface = _hasInterface || isOfMessages;
+    const std::string_view name = isOfMessages ? shortTechnologyName(interface->name) : std::string_view();
+    // Interfaces of another technology, whose packets are no messages of the reader's, keep their names.
+    const bool isReaders = isOfMessages && (name.empty() || name == _reader.technology());
+    if (isReaders && !_technology.empty() && name != _technology)
         add(pcapngCopy::renamedInterface(block, _technology));
-    else if (pcapngCopy::mayBeCopied(block))
+    else
         add(block.bytes);
 }
 
-/// Whether the block describes an interface of the messages that are named anew.
-bool RecordingCopy::isRenamed(const PcapngReader::Block& block) const {
-    if (_technology.empty())
-        return false;
-    const auto interface = InterfaceDescription::read(block.body(), block.bigEndian);
-    if (!interface || interface->linkType != pcapng::logMessageLinkType)
-        return false;
-    const std::string_view name = shortTechnologyName(interface->name);
-    return name != _technology && (name.empty() || name == _reader.technology());
-}
-
 void RecordingCopy::add(Bytes bytes) {
+    // Where the recording's own is damaged, what follows is little-endian to its reader.
+    if (!std::exchange(_hasSection, true))
+        pcapngBlocks::appendSection(_buffer);
     _buffer.insert(_buffer.end(), bytes.begin(), bytes.end());
     if (_buffer.size() >= flushThreshold)
         flush();

@@ -27,20 +27,22 @@ public:
 
     /// Adds the message that the reader last returned.
     Result<Done> addMessage();
-    /// Writes what is left.
+    /// Writes what is left, and the interface of the technology where the recording has none of messages.
     Result<Done> finish();
 
 private:
     void addOther(const PcapngReader::Block& block);
+    void addInterface(const PcapngReader::Block& block);
     void add(Bytes bytes);
     void flush();
-    [[nodiscard]] bool isRenamed(const PcapngReader::Block& block) const;
 
     PcapngReader& _reader;
     std::unique_ptr<OutputFile> _file;
     std::string _name;
     std::string _technology;
     std::vector<std::uint8_t> _buffer;
+    bool _hasSection = false;   ///< a section header has been added
+    bool _hasInterface = false; ///< an interface of messages has been added
     std::optional<Failure> _failure;
 };
 
