@@ -71,8 +71,9 @@ Result<std::unique_ptr<MessageReader>> openUnpacked(ChunkedInput input) {
 
 } // namespace
 
-Result<std::unique_ptr<MessageReader>> openMessages(const std::string& path) {
-    Result<std::unique_ptr<ByteSource>> source = FileSource::open(path);
+Result<std::unique_ptr<MessageReader>> openMessages(const std::string& path,
+                                                    std::function<void()> beforeWaiting) {
+    Result<std::unique_ptr<ByteSource>> source = FileSource::open(path, std::move(beforeWaiting));
     if (!source)
         return Failure{source.reason()};
     return openMessages(ChunkedInput(*std::move(source)));

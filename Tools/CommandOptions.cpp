@@ -39,6 +39,15 @@ CLI::Validator positiveCount() {
         "a number above 0");
 }
 
+CLI::Validator positiveSeconds() {
+    return validator(
+        [](const std::string& text) {
+            double seconds = 0;
+            return CLI::detail::lexical_cast(text, seconds) && seconds >= 0.001 && seconds <= 2e6;
+        },
+        "seconds from 0.001 to 2000000");
+}
+
 void addTechnology(CLI::App& command, std::string& technology, const std::string& purpose) {
     command
         .add_option("--technology", technology,

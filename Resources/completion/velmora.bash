@@ -82,7 +82,7 @@ _velmora_log() {
     for ((i = 1; i < cword; ++i)); do
         case ${words[i]} in
         --log | --log-level | --format | --every | --select | --from | --to | --technology | --jobs | --duration | \
-            --count | --description)
+            --count | --timeout | --description)
             ((++i))
             ;;
         -?*) ;;
@@ -108,7 +108,7 @@ _velmora_log() {
         _velmora_offer "${_velmora_technologies[@]}"
         return
         ;;
-    --select | --from | --to | --jobs | --duration | --count | --description)
+    --select | --from | --to | --jobs | --duration | --count | --timeout | --description)
         return # nothing that could be guessed
         ;;
     esac
@@ -125,8 +125,8 @@ _velmora_log() {
         return
         ;;
     decode) options+=(--format --every --select --from --to --technology --jobs) ;;
-    watch) options+=(--once) ;;
-    record) options+=(--force --duration --count) ;;
+    watch) options+=(--once --timeout) ;;
+    record) options+=(--force --duration --count --timeout) ;;
     convert) options+=(--force --technology --description) ;;
     info) options+=(--technology) ;;
     esac

@@ -91,6 +91,7 @@ TEST(CommandLineTest, RecordTakesItsLimits) {
     EXPECT_TRUE(record->force);
     EXPECT_EQ(record->duration_seconds, 1.5);
     EXPECT_EQ(record->count, 20U);
+    EXPECT_EQ(record->timeout_seconds, std::nullopt);
 }
 
 TEST(CommandLineTest, ConvertTakesWhatTheNewFileIsToBe) {
@@ -149,6 +150,9 @@ TEST(CommandLineTest, UsageErrorsGiveTheFoundAndTheExpectedValue) {
         {{"record", "a", "--count", "0"}, "--count: got 0, wanted a number above 0"},
         {{"record", "a", "--duration", "0"}, "--duration: got 0, wanted seconds from 0.001 to 2000000"},
         {{"record", "a", "--duration", "1e99"}, "--duration: got 1e99, wanted seconds from 0.001 to 2000000"},
+        {{"record", "a", "--timeout", "0"}, "--timeout: got 0, wanted seconds from 0.001 to 2000000"},
+        {{"watch", "--once", "--timeout", "x"}, "--timeout: got x, wanted seconds from 0.001 to 2000000"},
+        {{"watch", "--timeout", "1"}, "--timeout requires --once"},
         {{"convert", "a"}, "OUT is required"},
         {{"convert", "a", "-"}, "OUT: got -, wanted a name that ends in .pcapng, .velmora or .dlf"},
         {{"info", "a", "b"}, "The following argument was not expected: b"},

@@ -67,7 +67,12 @@ bool decodeFile(std::size_t index, const DecodeOptions& options, bool showsProgr
                 Output& output) {
     const std::string& path = options.files[index];
     const std::string title = fileTitle(path);
-    const Result<std::unique_ptr<MessageReader>> reader = openMessages(path);
+    // What has been decoded is written before more is waited for: at the other end a reader may wait for it.
+    std::unique_ptr<DecodeWriter> writer;
+    const Result<std::unique_ptr<MessageReader>> reader = openMessages(path, [&writer] {
+        if (writer)
+            writer->flush();
+    });
     if (!reader) {
         report(title + ": " + reader.reason());
         return false;
@@ -76,7 +81,7 @@ bool decodeFile(std::size_t index, const DecodeOptions& options, bool showsProgr
     if (options.files.size() > 1)
         heading = (index > 0 ? "\n== " : "== ") + printable(title) + " ==\n";
     const bool isLive = !inputSize(path);
-    const std::unique_ptr<DecodeWriter> writer = DecodeWriter::make(options, path, isLive, heading, output);
+    writer = DecodeWriter::make(options, path, isLive, heading, output);
     std::optional<ShownProgress> progress;
     if (showsProgress)
         progress.emplace(**reader, path, options);
