@@ -3,7 +3,7 @@
 
 #include "Tools/CommandOptions.h"
 
-#include "Platform/TelephonyService.h"
+#include "Tools/Technologies.h"
 
 #include <algorithm>
 #include <cstdint>
@@ -50,8 +50,12 @@ CLI::Validator positiveSeconds() {
 
 void addTechnology(CLI::App& command, std::string& technology, const std::string& purpose) {
     command
-        .add_option("--technology", technology,
-                    purpose + " this technology, overriding the file's: " + technologyNames())
+        .add_option_function<std::string>(
+            "--technology",
+            [&technology](const std::string& text) { technology = technologyMeantBy(text).value_or(text); },
+            purpose + " this technology, overriding the file's: " + technologyForms())
+        ->check(validator([](const std::string& text) { return technologyMeantBy(text).has_value(); },
+                          "one of " + technologyForms()))
         ->type_name("NAME");
 }
 

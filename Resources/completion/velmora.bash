@@ -105,7 +105,7 @@ _velmora_log() {
         return
         ;;
     --technology)
-        _velmora_offer "${_velmora_technologies[@]}"
+        _velmora_offer "${_velmora_technologies[@]}" GSM CDMA LTE UTRAN
         return
         ;;
     --select | --from | --to | --jobs | --duration | --count | --timeout | --description)

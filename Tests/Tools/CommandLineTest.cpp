@@ -15,6 +15,9 @@ namespace {
 using testing::ElementsAre;
 using testing::HasSubstr;
 
+const std::string technologies =
+    "IFX, GSM (Ostrel_GSM), CDMA (Ostrel_CDMA), LTE (Ostrel_LTE), UTRAN (Ostrel_UTRAN2)";
+
 CommandLine parse(std::vector<const char*> arguments) {
     arguments.insert(arguments.begin(), "velmora-log");
     return parseCommandLine(static_cast<int>(arguments.size()), arguments.data());
@@ -120,10 +123,35 @@ TEST(CommandLineTest, InfoTakesAFileAndATechnology) {
     EXPECT_EQ(info->technology, "Ostrel_LTE");
 }
 
+TEST(CommandLineTest, TechnologiesHaveShortFormsInAnyCase) {
+    const std::pair<const char*, const char*> rows[] = {
+        {"LTE", "Ostrel_LTE"},
+        {"lte", "Ostrel_LTE"},
+        {"Gsm", "Ostrel_GSM"},
+        {"UTRAN", "Ostrel_UTRAN2"},
+        {"cdma", "Ostrel_CDMA"},
+        {"ifx", "IFX"},
+        {"ostrel_utran2", "Ostrel_UTRAN2"},
+        {"KVOXLOGCHANNELTECHNOLOGY_OSTREL_LTE", "Ostrel_LTE"},
+        // These are taken as they are.
+        {"Ostrel_LTE", "Ostrel_LTE"},
+        {"kVoxLogChannelTechnology_Ostrel_LTE", "kVoxLogChannelTechnology_Ostrel_LTE"},
+    };
+    for (const auto& [text, technology] : rows) {
+        EXPECT_EQ(std::get<DecodeOptions>(parse({"decode", "a", "--technology", text}).command).technology,
+                  technology);
+        EXPECT_EQ(std::get<InfoOptions>(parse({"info", "a", "--technology", text}).command).technology,
+                  technology);
+        EXPECT_EQ(std::get<ConvertOptions>(parse({"convert", "a", "b.dlf", "--technology", text}).command)
+                      .technology,
+                  technology);
+    }
+}
+
 TEST(CommandLineTest, UsageErrorsGiveTheFoundAndTheExpectedValue) {
     struct Case {
         std::vector<const char*> arguments;
-        const char* message;
+        std::string message;
     };
     const Case cases[] = {
         {{}, "no command, wanted decode, watch, record, convert or info"},
@@ -155,6 +183,10 @@ TEST(CommandLineTest, UsageErrorsGiveTheFoundAndTheExpectedValue) {
         {{"watch", "--timeout", "1"}, "--timeout requires --once"},
         {{"convert", "a"}, "OUT is required"},
         {{"convert", "a", "-"}, "OUT: got -, wanted a name that ends in .pcapng, .velmora or .dlf"},
+        {{"decode", "--technology", "5G", "a"}, "--technology: got 5G, wanted one of " + technologies},
+        {{"convert", "--technology", "Ostrel_XYZ", "a", "b.dlf"},
+         "--technology: got Ostrel_XYZ, wanted one of " + technologies},
+        {{"info", "--technology", "", "a"}, "--technology: got , wanted one of " + technologies},
         {{"info", "a", "b"}, "The following argument was not expected: b"},
         {{"watch", "--log-level", "8"}, "--log-level: got 8, wanted a number from 0 to 7"},
         {{"--log", "file", "watch"}, "--log: got file, wanted syslog or stderr"},
