@@ -6,6 +6,7 @@
 #include "Platform/Bytes.h"
 #include "Platform/Clock.h"
 #include "Platform/Result.h"
+#include "Recording/Comments.h"
 
 #include <cstddef>
 #include <cstdint>
@@ -70,6 +71,9 @@ public:
     virtual void setReadsAllTechnologies(bool) {}
     /// The file's form, for messages: "recording", "snapshot", "DLF log".
     [[nodiscard]] virtual std::string_view form() const { return "recording"; }
+    /// Whether the file is gzip'd; offsets are those in what it unpacks to.
+    [[nodiscard]] bool isCompressed() const { return _isCompressed; }
+    void setCompressed() { _isCompressed = true; }
     /// The read error that ended the stream early; absent when it ended with the file.
     [[nodiscard]] virtual const std::optional<Failure>& failure() const = 0;
 
@@ -77,16 +81,21 @@ public:
     [[nodiscard]] const std::vector<Loss>& losses() const { return _losses; }
     /// All losses so far.
     [[nodiscard]] const LossTotals& lossTotals() const { return _lossTotals; }
+    /// The comments so far.
+    [[nodiscard]] const Comments& comments() const { return _comments; }
 
 protected:
     MessageReader() = default;
     /// Whether the next loss will be kept, so that its reason is worth composing.
     [[nodiscard]] bool keepsLoss() const { return _losses.size() < maximumLosses; }
     void addLoss(Loss loss);
+    void addComment(Comment comment) { _comments.add(std::move(comment)); }
 
 private:
     std::vector<Loss> _losses;
     LossTotals _lossTotals;
+    Comments _comments;
+    bool _isCompressed = false;
 };
 
 } // namespace velmora

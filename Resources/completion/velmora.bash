@@ -82,7 +82,7 @@ _velmora_log() {
     for ((i = 1; i < cword; ++i)); do
         case ${words[i]} in
         --log | --log-level | --format | --every | --select | --from | --to | --code | --technology | --jobs | \
-            --duration | --count | --description)
+            --duration | --count | --timeout | --description)
             ((++i))
             ;;
         -?*) ;;
@@ -105,16 +105,16 @@ _velmora_log() {
         return
         ;;
     --technology)
-        _velmora_offer "${_velmora_technologies[@]}"
+        _velmora_offer "${_velmora_technologies[@]}" GSM CDMA LTE UTRAN
         return
         ;;
-    --select | --from | --to | --code | --jobs | --duration | --count | --description)
+    --select | --from | --to | --code | --jobs | --duration | --count | --timeout | --description)
         return # nothing that could be guessed
         ;;
     esac
     $split && return
 
-    local options=(-h --help --log --log-level)
+    local options=(-h --help --log --log-level -v --verbose)
     case $command in
     '')
         if [[ $cur == -* ]]; then
@@ -125,8 +125,8 @@ _velmora_log() {
         return
         ;;
     decode) options+=(--format --every --select --from --to --code --warm --technology --strict --jobs) ;;
-    watch) options+=(--once) ;;
-    record) options+=(--force --duration --count) ;;
+    watch) options+=(--once --timeout) ;;
+    record) options+=(--force --duration --count --timeout) ;;
     convert) options+=(--force --from --to --code --technology --description --strict) ;;
     info) options+=(--technology) ;;
     esac

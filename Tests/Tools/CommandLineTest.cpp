@@ -15,6 +15,9 @@ namespace {
 using testing::ElementsAre;
 using testing::HasSubstr;
 
+const std::string technologies =
+    "IFX, GSM (Ostrel_GSM), CDMA (Ostrel_CDMA), LTE (Ostrel_LTE), UTRAN (Ostrel_UTRAN2)";
+
 CommandLine parse(std::vector<const char*> arguments) {
     arguments.insert(arguments.begin(), "velmora-log");
     return parseCommandLine(static_cast<int>(arguments.size()), arguments.data());
@@ -85,6 +88,13 @@ TEST(CommandLineTest, LogOptionsMayPrecedeOrFollowTheCommand) {
     }
 }
 
+TEST(CommandLineTest, VerboseMayPrecedeOrFollowTheCommand) {
+    for (const auto& arguments :
+         {std::vector<const char*>{"-v", "info", "a"}, std::vector<const char*>{"info", "--verbose", "a"}})
+        EXPECT_TRUE(parse(arguments).verbose);
+    EXPECT_FALSE(parse({"info", "a"}).verbose);
+}
+
 TEST(CommandLineTest, RecordTakesItsLimits) {
     const CommandLine line =
         parse({"record", "--duration", "1.5", "--count", "20", "--force", "drive.pcapng"});
@@ -94,6 +104,7 @@ TEST(CommandLineTest, RecordTakesItsLimits) {
     EXPECT_TRUE(record->force);
     EXPECT_EQ(record->duration_seconds, 1.5);
     EXPECT_EQ(record->count, 20U);
+    EXPECT_EQ(record->timeout_seconds, std::nullopt);
 }
 
 TEST(CommandLineTest, ConvertTakesWhatTheNewFileIsToBe) {
@@ -128,10 +139,35 @@ TEST(CommandLineTest, InfoTakesAFileAndATechnology) {
     EXPECT_EQ(info->technology, "Ostrel_LTE");
 }
 
+TEST(CommandLineTest, TechnologiesHaveShortFormsInAnyCase) {
+    const std::pair<const char*, const char*> rows[] = {
+        {"LTE", "Ostrel_LTE"},
+        {"lte", "Ostrel_LTE"},
+        {"Gsm", "Ostrel_GSM"},
+        {"UTRAN", "Ostrel_UTRAN2"},
+        {"cdma", "Ostrel_CDMA"},
+        {"ifx", "IFX"},
+        {"ostrel_utran2", "Ostrel_UTRAN2"},
+        {"KVOXLOGCHANNELTECHNOLOGY_OSTREL_LTE", "Ostrel_LTE"},
+        // These are taken as they are.
+        {"Ostrel_LTE", "Ostrel_LTE"},
+        {"kVoxLogChannelTechnology_Ostrel_LTE", "kVoxLogChannelTechnology_Ostrel_LTE"},
+    };
+    for (const auto& [text, technology] : rows) {
+        EXPECT_EQ(std::get<DecodeOptions>(parse({"decode", "a", "--technology", text}).command).technology,
+                  technology);
+        EXPECT_EQ(std::get<InfoOptions>(parse({"info", "a", "--technology", text}).command).technology,
+                  technology);
+        EXPECT_EQ(std::get<ConvertOptions>(parse({"convert", "a", "b.dlf", "--technology", text}).command)
+                      .technology,
+                  technology);
+    }
+}
+
 TEST(CommandLineTest, UsageErrorsGiveTheFoundAndTheExpectedValue) {
     struct Case {
         std::vector<const char*> arguments;
-        const char* message;
+        std::string message;
     };
     const Case cases[] = {
         {{}, "no command, wanted decode, watch, record, convert or info"},
@@ -163,8 +199,15 @@ TEST(CommandLineTest, UsageErrorsGiveTheFoundAndTheExpectedValue) {
         {{"record", "a", "--count", "0"}, "--count: got 0, wanted a number above 0"},
         {{"record", "a", "--duration", "0"}, "--duration: got 0, wanted seconds from 0.001 to 2000000"},
         {{"record", "a", "--duration", "1e99"}, "--duration: got 1e99, wanted seconds from 0.001 to 2000000"},
+        {{"record", "a", "--timeout", "0"}, "--timeout: got 0, wanted seconds from 0.001 to 2000000"},
+        {{"watch", "--once", "--timeout", "x"}, "--timeout: got x, wanted seconds from 0.001 to 2000000"},
+        {{"watch", "--timeout", "1"}, "--timeout requires --once"},
         {{"convert", "a"}, "OUT is required"},
         {{"convert", "a", "-"}, "OUT: got -, wanted a name that ends in .pcapng, .velmora or .dlf"},
+        {{"decode", "--technology", "5G", "a"}, "--technology: got 5G, wanted one of " + technologies},
+        {{"convert", "--technology", "Ostrel_XYZ", "a", "b.dlf"},
+         "--technology: got Ostrel_XYZ, wanted one of " + technologies},
+        {{"info", "--technology", "", "a"}, "--technology: got , wanted one of " + technologies},
         {{"info", "a", "b"}, "The following argument was not expected: b"},
         {{"watch", "--log-level", "8"}, "--log-level: got 8, wanted a number from 0 to 7"},
         {{"--log", "file", "watch"}, "--log: got file, wanted syslog or stderr"},

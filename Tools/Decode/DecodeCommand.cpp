@@ -8,15 +8,18 @@
 #include "Tools/Decode/CSVRows.h"
 #include "Tools/Decode/DecodeProgress.h"
 #include "Tools/Decode/DecodeWriter.h"
+#include "Tools/Decode/FileTechnologies.h"
 #include "Tools/Decode/Jobs/JobScheduler.h"
 #include "Tools/Decode/KnownCatalogues.h"
 #include "Tools/Decode/PathCheck.h"
 #include "Tools/Decode/Samples/SampleRows.h"
 #include "Tools/Decode/Samples/WideRows.h"
 #include "Tools/ExitStatus.h"
+#include "Tools/Log/DecoderLog.h"
 #include "Tools/LogOverride.h"
 #include "Tools/Output.h"
 #include "Tools/Report.h"
+#include "Tools/Text/PrintableText.h"
 
 #include <algorithm>
 #include <memory>
@@ -37,8 +40,11 @@ bool writesAsItGoes(const DecodeOptions& options) {
 /// The progress of one file on standard error, if that is a terminal and the file is long enough.
 class ShownProgress {
 public:
-    ShownProgress(const std::string& path, const DecodeOptions& options) {
+    ShownProgress(const MessageReader& reader, const std::string& path, const DecodeOptions& options) {
         if (::isatty(STDERR_FILENO) == 0)
+            return;
+        // Of a gzip'd file the offsets are no shares of its size.
+        if (reader.isCompressed())
             return;
         // On the same terminal it would mix with the lines.
         if (writesAsItGoes(options) && ::isatty(STDOUT_FILENO) != 0)
@@ -71,13 +77,14 @@ bool needsTechnologies(const DecodeOptions& options) {
 
 /// Whether csv needs a column for the technology. Only files that can be read twice are looked at, and they
 /// make it a rule for the others as well.
-bool needsTechnologyColumn(const DecodeOptions& options) {
+bool needsTechnologyColumn(const DecodeOptions& options, FileTechnologies& technologies) {
     return options.format == DecodeOptions::Format::Csv && options.technology.empty() &&
            std::any_of(options.files.begin(), options.files.end(),
-                       [](const std::string& file) { return technologiesOf(file).size() > 1; });
+                       [&](const std::string& file) { return technologies.of(file).size() > 1; });
 }
 
-DecodingRequest requestFor(const std::string& path, const DecodeOptions& options) {
+DecodingRequest requestFor(const std::string& path, const DecodeOptions& options,
+                           FileTechnologies& technologies) {
     using Several = DecodingRequest::Several;
     DecodingRequest request;
     request.technology = options.technology;
@@ -86,7 +93,7 @@ DecodingRequest requestFor(const std::string& path, const DecodeOptions& options
     const bool lacksColumn = options.format == DecodeOptions::Format::Csv && !options.hasTechnologyColumn;
     request.several = lacksColumn && options.technology.empty() ? Several::First : Several::Decode;
     if (needsTechnologies(options))
-        request.technologies = technologiesOf(path);
+        request.technologies = technologies.of(path);
     if (path == "-")
         request.checkDecoder = [&options](LogGenerator& decoder) {
             if (options.selection.paths().empty() || options.files.size() > 1)
@@ -98,30 +105,39 @@ DecodingRequest requestFor(const std::string& path, const DecodeOptions& options
 }
 
 /// Decodes one file and prints it. Returns whether all of it was read.
-bool decodeFile(std::size_t index, const DecodeOptions& options, bool showsProgress, SampleColumns& columns,
-                Output& output) {
+bool decodeFile(std::size_t index, const DecodeOptions& options, bool showsProgress,
+                FileTechnologies& technologies, SampleColumns& columns, DecoderLines& lines, Output& output) {
     const std::string& path = options.files[index];
     const std::string title = fileTitle(path);
-    DecodingRequest request = requestFor(path, options);
-    const Result<std::unique_ptr<MessageReader>> reader = openMessages(path);
+    DecodingRequest request = requestFor(path, options, technologies);
+    // What has been decoded is written before more is waited for: at the other end a reader may wait for it.
+    std::unique_ptr<DecodeWriter> writer;
+    const Result<std::unique_ptr<MessageReader>> reader = openMessages(path, [&writer] {
+        if (writer)
+            writer->flush();
+    });
     if (!reader) {
         report(title + ": " + reader.reason());
         return false;
     }
     const bool isLive = !inputSize(path);
-    const std::unique_ptr<DecodeWriter> writer = DecodeWriter::make(options, index, isLive, columns, output);
+    writer = DecodeWriter::make(options, index, isLive, columns, output);
     std::optional<ShownProgress> progress;
     if (showsProgress)
-        progress.emplace(path, options);
+        progress.emplace(**reader, path, options);
     const auto clearProgress = [&progress] {
         if (progress)
             progress->clear();
     };
+    const auto sumUp = [&] { lines.report(options.files.size() > 1 ? printable(title) : std::string()); };
     WorkContext context(title, [&] {
         clearProgress();
         writer->flush();
+        sumUp();
     });
     request.progress = progress ? progress->get() : nullptr;
+    // Over the progress line, which only lines that are written replace.
+    const DecoderLog log(lines);
     const Result<DecodedFile> decoded = decodeMessages(**reader, request, context, *writer);
     clearProgress();
     if (decoded)
@@ -131,6 +147,7 @@ bool decodeFile(std::size_t index, const DecodeOptions& options, bool showsProgr
         report(title + ": " + decoded.reason());
     const bool allDecoded = decoded && decoded->undecoded.report(title);
     const bool whole = reportLosses(**reader, title);
+    sumUp();
     return allDecoded && whole;
 }
 
@@ -146,10 +163,11 @@ std::string headerOf(const DecodeOptions& options, const SampleColumns& columns)
 
 } // namespace
 
-int runDecode(const DecodeOptions& given, Output& output) {
+int runDecode(const DecodeOptions& given, DecoderLines& lines, Output& output) {
     DecodeOptions options = given;
-    options.hasTechnologyColumn = needsTechnologyColumn(options);
-    const KnownCatalogues known(options);
+    FileTechnologies technologies;
+    options.hasTechnologyColumn = needsTechnologyColumn(options, technologies);
+    const KnownCatalogues known(options, technologies);
     const auto problem =
         known.areAll() ? impossiblePath(options.selection, known.catalogues()) : std::nullopt;
     if (problem) {
@@ -168,13 +186,13 @@ int runDecode(const DecodeOptions& given, Output& output) {
     bool good = true;
     if (jobs > 1) {
         const Job job = [&](std::size_t index, Output& part) {
-            return decodeFile(index, options, false, columns, part);
+            return decodeFile(index, options, false, technologies, columns, lines, part);
         };
         good = JobScheduler(options.files.size(), jobs, job, output).run();
     } else {
         try {
             for (std::size_t index = 0; index < options.files.size() && output.isOpen(); ++index)
-                good = decodeFile(index, options, true, columns, output) && good;
+                good = decodeFile(index, options, true, technologies, columns, lines, output) && good;
         } catch (const ImpossiblePath& impossible) {
             report(std::string("--select: ") + impossible.what());
             return ExitStatus::Usage;

@@ -3,8 +3,9 @@
 
 #include "Tools/Decode/KnownCatalogues.h"
 
-#include "Recording/OpenMessages.h"
 #include "Tools/Decode/DecodeOptions.h"
+#include "Tools/Decode/FileTechnologies.h"
+#include "Tools/Log/QuietConsole.h"
 #include "Tools/LogOverride.h"
 #include "Tools/Technologies.h"
 
@@ -23,7 +24,7 @@ public:
 
 } // namespace
 
-KnownCatalogues::KnownCatalogues(const DecodeOptions& options) {
+KnownCatalogues::KnownCatalogues(const DecodeOptions& options, FileTechnologies& technologies) {
     if (options.selection.paths().empty())
         return;
     if (!options.technology.empty()) {
@@ -34,13 +35,14 @@ KnownCatalogues::KnownCatalogues(const DecodeOptions& options) {
         if (file == "-")
             _areAll = false;
         else
-            for (const std::string& technology : technologiesOf(file))
+            for (const std::string& technology : technologies.of(file))
                 add(technology);
     }
 }
 
 KnownCatalogues::~KnownCatalogues() {
     const SilentLog silence;
+    const QuietConsole noConsole;
     _decoders.clear();
 }
 
@@ -49,6 +51,7 @@ void KnownCatalogues::add(const std::string& technology) {
     if (!constant || std::find(_names.begin(), _names.end(), *constant) != _names.end())
         return;
     const SilentLog silence;
+    const QuietConsole noConsole;
     _names.push_back(*constant);
     if (Result<std::unique_ptr<LogGenerator>> decoder = makeDecoder(*constant, _clock)) {
         _catalogues.push_back(&(*decoder)->catalogue());

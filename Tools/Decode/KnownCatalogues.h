@@ -13,6 +13,7 @@
 
 namespace velmora {
 
+class FileTechnologies;
 struct DecodeOptions;
 
 /// The catalogues of the technologies that decoding will meet, as far as they are known before: what standard
@@ -21,7 +22,7 @@ struct DecodeOptions;
 class KnownCatalogues {
 public:
     /// None where the options do not need them: without a selection.
-    explicit KnownCatalogues(const DecodeOptions& options);
+    KnownCatalogues(const DecodeOptions& options, FileTechnologies& technologies);
     ~KnownCatalogues();
     KnownCatalogues(const KnownCatalogues&) = delete;
     KnownCatalogues& operator=(const KnownCatalogues&) = delete;

@@ -81,6 +81,22 @@ std::string composeFrame(const std::vector<TreeRow>& rows, std::string_view stat
     return frame;
 }
 
+std::vector<TreeRow> adviceRows(std::string_view text, std::size_t columns) {
+    std::vector<TreeRow> rows;
+    while (!text.empty()) {
+        std::size_t length = text.size();
+        if (length > columns) {
+            const std::size_t blank = text.rfind(' ', columns);
+            length = blank == text.npos || blank == 0 ? columns : blank;
+        }
+        rows.push_back({std::string(text.substr(0, length)), false});
+        text.remove_prefix(length);
+        while (text.starts_with(' '))
+            text.remove_prefix(1);
+    }
+    return rows;
+}
+
 std::size_t scrolledBy(Key key, std::size_t scroll, const ScreenLayout& layout) {
     const std::size_t last = layout.maximumScroll();
     const std::size_t page = std::max<std::size_t>(layout.pageSize(), 1);

@@ -139,7 +139,7 @@ TEST_F(DecodeCommandTest, RecordingWithoutMessagesHasAnEmptyDisplay) {
 
 TEST_F(DecodeCommandTest, TechnologyOptionOverridesTheFile) {
     writeRecording("a.pcapng", "Nonesuch", {{at(0), rrState(4)}, {at(0), rrState(5)}});
-    for (const char* name : {"Ostrel_GSM", "kVoxLogChannelTechnology_Ostrel_GSM"}) {
+    for (const char* name : {"Ostrel_GSM", "kVoxLogChannelTechnology_Ostrel_GSM", "GSM", "gsm"}) {
         ToolProcess process(tool({"decode", "--format", "json", "--technology", name, path("a.pcapng")}));
         EXPECT_EQ(process.exitStatus(), 0);
         EXPECT_EQ(process.output(), idleJson) << name;
@@ -159,8 +159,6 @@ TEST_F(DecodeCommandTest, UnknownOrMissingTechnologyIsReportedWithTheValidOnes) 
          path("none.pcapng") + ": names no technology, " + names + "; --technology supplies it"},
         {{"decode", path("other.pcapng")},
          path("other.pcapng") + ": technology \"Nonesuch\" is unknown, " + names},
-        {{"decode", "--technology", "gsm", path("none.pcapng")},
-         path("none.pcapng") + ": technology \"gsm\" is unknown, " + names},
     };
     for (const Case& row : cases) {
         ToolProcess process(tool(row.arguments));
@@ -282,12 +280,51 @@ TEST_F(DecodeCommandTest, ClosedStandardOutputIsReported) {
               "velmora-log: cannot write standard output: Bad file descriptor\n");
 }
 
+TEST_F(DecodeCommandTest, DecoderLinesAreSummedUpUnlessVerbose) {
+    // A type of 2 is dropped with a line.
+    writeRecording("odd.pcapng", "Ostrel_GSM",
+                   {{at(0), record(0x512C, "04 00 01 00", 2)}, {at(1), record(0x512C, "04 00 01 00", 2)}});
+    writeDrive("drive.pcapng");
+    ToolProcess sums(tool({"decode", path("odd.pcapng")}));
+    EXPECT_EQ(sums.exitStatus(), 0);
+    EXPECT_EQ(sums.errors(), "<3>2 times: Invalid log type: 2. Dropping.\n");
+    ToolProcess lines(tool({"decode", "--verbose", path("odd.pcapng")}));
+    EXPECT_EQ(lines.exitStatus(), 0);
+    EXPECT_THAT(lines.errors(),
+                testing::MatchesRegex("<3>Creating Ostrel_GSMLogGenerator object\n"
+                                      "<3>Creating OstrelLogGenerator2 object with 0x[0-9a-f]+\n"
+                                      "<3>Class Index: 1\n"
+                                      "<3>Invalid log type: 2. Dropping.\n"
+                                      "<3>Invalid log type: 2. Dropping.\n"
+                                      "Deallocing Ostrel_GSMClassIndex\n"
+                                      "Deallocing ClassIndex\n"));
+    // With several files each sum names its file, whether or not processes share the work.
+    const std::string both = "<3>" + path("odd.pcapng") + ": 2 times: Invalid log type: 2. Dropping.\n";
+    for (const char* const jobs : {"1", "2"}) {
+        ToolProcess several(tool({"decode", "--jobs", jobs, path("odd.pcapng"), path("drive.pcapng")}));
+        EXPECT_EQ(several.exitStatus(), 0);
+        EXPECT_EQ(several.errors(), both) << jobs;
+    }
+}
+
+TEST_F(DecodeCommandTest, ADecoderThatEndsTheProgramHasItsLinesSummedUpBefore) {
+    const std::vector<std::uint64_t> offsets = writeRecording(
+        "sim.pcapng", "Ostrel_GSM",
+        {{at(0), record(0x512C, "04 00 01 00", 2)}, {at(1), record(0x0000, "DE AD BE EF", 0xFF)}});
+    ToolProcess process(tool({"decode", path("sim.pcapng")}));
+    EXPECT_EQ(process.exitStatus(), 1);
+    EXPECT_THAT(process.errors(), testing::StartsWith("<3>Invalid log type: 2. Dropping.\n"));
+    EXPECT_THAT(process.errors(), testing::EndsWith("velmora-log: " + path("sim.pcapng") +
+                                                    ": record 2 at offset " + std::to_string(offsets[1]) +
+                                                    ": SIM File dictionary data could not be constructed\n"));
+}
+
 TEST_F(DecodeCommandTest, LogLevelDecidesWhichLinesAreWritten) {
     writeDrive("drive.pcapng");
     ToolProcess quiet(tool({"--log-level", "0", "decode", path("drive.pcapng")}));
     EXPECT_EQ(quiet.exitStatus(), 0);
     EXPECT_EQ(quiet.errors().find('<'), std::string::npos) << quiet.errors();
-    ToolProcess loud(tool({"decode", path("drive.pcapng"), "--log-level", "4", "--log", "stderr"}));
+    ToolProcess loud(tool({"decode", path("drive.pcapng"), "-v", "--log-level", "4", "--log", "stderr"}));
     EXPECT_EQ(loud.exitStatus(), 0);
     EXPECT_THAT(loud.errors(), HasSubstr("<4>GSMRRInfo\n"));
     EXPECT_EQ(loud.output(), idleText);
