@@ -174,13 +174,37 @@ void Observer::supplied(const Field& field, const Value& value) {
     for (const FieldMap::Entry& entry : _map->find(currentList(), field)) {
         if (entry.source->code != _code)
             continue;
+        const std::size_t firstOfLeaf = _observations.size();
         if (value.asDictionary() || value.asArray())
             tree(_map->catalogue(), *entry.node, _map->section(), value);
         else
             leaf(*entry.node->leaf(), value);
+        if (_levels.empty()) // the rows of a list go with the list
+            removeOthers(*entry.node, firstOfLeaf);
     }
     if (const Dictionary* const row = value.asDictionary(); row && !_levels.empty())
         setRowKey(first, *row);
+}
+
+void Observer::removeOthers(const Catalogue::Node& node, std::size_t first) {
+    const auto shown = _observations.begin() + static_cast<std::ptrdiff_t>(first);
+    const CatalogueField* const leaf = node.leaf();
+    const auto isLeaf = [leaf](const Observation& each) { return each.leaf == leaf; };
+    if (leaf && std::none_of(shown, _observations.end(), isLeaf))
+        _removed.push_back(leaf);
+    for (const std::unique_ptr<Catalogue::Node>& child : node.children())
+        removeOthers(*child, first);
+}
+
+void Observer::display(Catalogue& catalogue, const Value& value) {
+    tree(catalogue, catalogue.root(), {}, value);
+    _displayed.assign(catalogue.fields().size(), false);
+    for (const Observation& each : _observations)
+        _displayed[each.leaf->index] = true;
+    for (std::size_t i = 0; i < _displayedBefore.size(); ++i)
+        if (_displayedBefore[i] && !_displayed[i])
+            _removed.push_back(&catalogue.fields()[i]);
+    std::swap(_displayed, _displayedBefore);
 }
 
 void Observer::setRowKey(std::size_t first, const Dictionary& row) {

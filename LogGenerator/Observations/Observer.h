@@ -36,6 +36,9 @@ public:
     /// The leaves of a property list that is shown at the node.
     void tree(Catalogue& catalogue, Catalogue::Node& node, std::string_view section, const Value& value);
 
+    /// The same of the entire display: what an earlier one had and this one has not is removed.
+    void display(Catalogue& catalogue, const Value& value);
+
     void fields(const Record& record, const Layout& layout) override;
     void number(const Field& field, std::int64_t raw) override;
     void real(const Field& field, double value) override;
@@ -65,6 +68,9 @@ private:
     void forEachLeaf(const Field& field, Observe observe);
     Observation& add(const CatalogueField& leaf, const CatalogueSource* source);
     void setCode(const Field& field, std::string_view digits, Observation& observation) const;
+    /// The leaves at the node and below it that none of the observations from that one on is of show nothing
+    /// any more.
+    void removeOthers(const Catalogue::Node& node, std::size_t first);
     /// The observations from that one on are of a row that was supplied as a dictionary.
     void setRowKey(std::size_t first, const Dictionary& row);
     /// A value of a list without rows begins.
@@ -78,6 +84,8 @@ private:
     std::vector<Observation> _observations;
     std::vector<ObservedList> _lists;
     std::vector<const CatalogueField*> _removed;
+    std::vector<bool> _displayed; ///< by index in the catalogue, see `display`
+    std::vector<bool> _displayedBefore;
     std::vector<Level> _levels;
     TextArena _texts;
     std::deque<RowNumbers> _rows; ///< the numbers of each row, a storage that is used again
