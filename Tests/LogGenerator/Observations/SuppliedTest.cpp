@@ -75,6 +75,19 @@ TEST_F(SuppliedTest, ATreeIsObservedLeafByLeaf) {
     EXPECT_EQ(message.lists[0].rows, 2u);
 }
 
+TEST_F(SuppliedTest, WhatATreeLacksIsRemoved) {
+    supply(dictionary({{"LAI", "00F110"}, {"TMSI", "01020304"}}));
+    EXPECT_THAT(removed(), ElementsAre("/Section/File"));
+    observer.beginMessage();
+    ASSERT_TRUE(observer.beginSection(map, code));
+    observer.supplied(file, dictionary({{"TMSI", "05060708"}}));
+    EXPECT_THAT(removed(), ElementsAre("/Section/File", "/Section/File/LAI"));
+    observer.beginMessage();
+    ASSERT_TRUE(observer.beginSection(map, code));
+    observer.supplied(file, "text");
+    EXPECT_THAT(removed(), ElementsAre("/Section/File/LAI", "/Section/File/TMSI"));
+}
+
 TEST_F(SuppliedTest, ANewLeafEntersTheCatalogueOnce) {
     supply(dictionary({{"New", "1"}}));
     const std::size_t leaves = catalogue.fields().size();
@@ -100,7 +113,7 @@ TEST_F(SuppliedTest, RowsOfAListHaveTheirIndexAndKey) {
 
 class TreeTest : public ObservationFixture {
 protected:
-    void show(const Value& value) { observer.tree(catalogue, catalogue.root(), {}, value); }
+    void show(const Value& value) { observer.display(catalogue, value); }
 };
 
 TEST_F(TreeTest, NumbersAreReadFromTextsWhereThereIsNothingElse) {
@@ -129,6 +142,17 @@ TEST_F(TreeTest, ANumberInAnotherUnitIsAbsent) {
     show(dictionary({{"RxLev", "none"}}));
     EXPECT_EQ(only().kind, ObservedKind::Absent);
     EXPECT_EQ(textOf(only()), "none");
+}
+
+TEST_F(TreeTest, WhatTheNextDisplayLacksIsRemoved) {
+    show(dictionary({{"State", "Call"}, {"Channel", dictionary({{"ARFCN", "62"}, {"HSN", "1"}})}}));
+    EXPECT_THAT(removed(), ElementsAre());
+    observer.beginMessage();
+    show(dictionary({{"State", "Idle"}, {"Channel", "None"}}));
+    EXPECT_THAT(removed(), ElementsAre("/Channel/ARFCN", "/Channel/HSN"));
+    observer.beginMessage();
+    show(dictionary({{"State", "Idle"}, {"Channel", "None"}}));
+    EXPECT_THAT(removed(), ElementsAre());
 }
 
 TEST_F(TreeTest, ElsewhereTextsStayTexts) {
