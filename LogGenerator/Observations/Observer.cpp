@@ -4,6 +4,7 @@
 #include "LogGenerator/Observations/Observer.h"
 
 #include "LogGenerator/Observations/TextNumber.h"
+#include "Platform/DateText.h"
 #include "PropertyLists/Value.h"
 
 #include <algorithm>
@@ -237,14 +238,20 @@ void Observer::leaf(const CatalogueField& leaf, const Value& value) {
         observation.kind = ObservedKind::Number;
         observation.number = static_cast<double>(*integer);
         observation.given = _texts.add() = std::to_string(*integer);
-    } else if (const double* const number = value.asReal(); number && std::isfinite(*number)) {
+    } else if (const double* const number = value.asReal()) {
+        observation.given = _texts.add() = std::to_string(*number);
+        if (!std::isfinite(*number))
+            return; // absent
         observation.kind = ObservedKind::Number;
         observation.number = *number;
-        observation.given = _texts.add() = std::to_string(*number);
     } else if (const bool* const flag = value.asBoolean()) {
         observation.kind = ObservedKind::Flag;
         observation.raw = *flag ? 1 : 0;
         observation.given = *flag ? "true" : "false";
+    } else if (const Date* const date = value.asDate()) {
+        observation.kind = ObservedKind::Text;
+        observation.given = _texts.add() = dateAndTimeText(*date, " ");
+        observation.words = observation.given;
     } else if (const Data* const data = value.asData()) {
         observation.kind = ObservedKind::Binary;
         observation.bytes = data->bytes();

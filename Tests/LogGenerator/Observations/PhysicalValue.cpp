@@ -85,6 +85,8 @@ std::string ofAbsence(const Observation& observation, const std::string& text) {
     const std::vector<std::string>& texts = observation.leaf->absentTexts;
     if (std::find(texts.begin(), texts.end(), text) != texts.end() || observation.leaf->isReadFromText)
         return {};
+    if (text == "nan" || text == "-nan" || text == "inf" || text == "-inf")
+        return {}; // as supplied
     // Texts without end: what is not finite, the reason with a number, and what are no digits.
     if (observation.text == Observation::Text::OfReal && !std::isfinite(observation.shown))
         return {};

@@ -8,6 +8,7 @@
 #include "Tests/Support/Hex.h"
 
 #include <algorithm>
+#include <chrono>
 #include <iterator>
 #include <string>
 
@@ -180,6 +181,7 @@ Value RandomMessages::anything(int depth) {
             dictionary->set("Key " + std::to_string(between(0, 4)), anything(depth - 1));
         return dictionary;
     }
+    case 4: return Date(std::chrono::seconds(between(0, 2'000'000'000)));
     default: return std::to_string(between(-5, 99999));
     }
 }

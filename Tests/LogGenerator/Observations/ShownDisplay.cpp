@@ -3,6 +3,8 @@
 
 #include "Tests/LogGenerator/Observations/ShownDisplay.h"
 
+#include "Platform/DateText.h"
+
 #include <algorithm>
 #include <stdexcept>
 
@@ -37,6 +39,8 @@ std::string textOf(const Value& value) {
         return std::to_string(*real);
     if (const bool* const flag = value.asBoolean())
         return *flag ? "true" : "false";
+    if (const Date* const date = value.asDate())
+        return dateAndTimeText(*date, " ");
     return {};
 }
 
@@ -96,9 +100,11 @@ void ShownDisplay::read(const Value& value, const Place& place) {
 }
 
 void ShownDisplay::readDictionary(const Dictionary& dictionary, const Place& place) {
-    for (const auto& [key, value] : dictionary)
+    for (const auto& [key, value] : dictionary) {
+        isAmbiguous |= key == "*" || key.find('/') != std::string::npos;
         if (key != sortedMarker)
             read(value, {below(place.path, key), below(place.pattern, key), childOf(place.node, key)});
+    }
 }
 
 void ShownDisplay::readNumbered(const Dictionary& entries, const Place& place) {

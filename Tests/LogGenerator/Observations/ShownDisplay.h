@@ -28,6 +28,8 @@ struct ShownDisplay {
     std::map<std::string, std::vector<std::size_t>> lists; ///< by pattern: how many entries
     std::set<std::string> emptyOnly; ///< those that are empty and never have anything, by the catalogue
     std::map<std::string, std::string> marked; ///< the pattern by the path
+    /// Whether a key is named as rows are, or as a path: then a path does not tell which of them it is.
+    bool isAmbiguous = false;
 
 private:
     struct Place {

@@ -6,6 +6,9 @@
 
 #include <gmock/gmock.h>
 
+#include <chrono>
+#include <limits>
+
 namespace velmora {
 namespace {
 
@@ -54,6 +57,26 @@ TEST_F(SuppliedTest, ABooleanIsAFlag) {
     EXPECT_EQ(only().kind, ObservedKind::Flag);
     EXPECT_EQ(only().raw, 1);
     EXPECT_EQ(textOf(only()), "true");
+}
+
+TEST_F(SuppliedTest, ARealIsANumber) {
+    supply(2.5);
+    EXPECT_EQ(only().kind, ObservedKind::Number);
+    EXPECT_EQ(only().number, 2.5);
+    EXPECT_EQ(textOf(only()), "2.500000");
+}
+
+TEST_F(SuppliedTest, ARealThatIsNotFiniteIsAbsent) {
+    supply(std::numeric_limits<double>::infinity());
+    EXPECT_EQ(only().kind, ObservedKind::Absent);
+    EXPECT_EQ(textOf(only()), "inf");
+}
+
+TEST_F(SuppliedTest, ADateIsAText) {
+    using namespace std::chrono;
+    supply(Date(sys_days{year{2026} / January / 5} + 8h));
+    EXPECT_EQ(only().kind, ObservedKind::Text);
+    EXPECT_EQ(only().words, "2026-01-05 08:00:00");
 }
 
 TEST_F(SuppliedTest, DataIsBytes) {
@@ -142,6 +165,11 @@ TEST_F(TreeTest, ANumberInAnotherUnitIsAbsent) {
     show(dictionary({{"RxLev", "none"}}));
     EXPECT_EQ(only().kind, ObservedKind::Absent);
     EXPECT_EQ(textOf(only()), "none");
+}
+
+TEST_F(TreeTest, OnlyAKeyThatIsAStarNamesRows) {
+    show(dictionary({{"*b", array({dictionary({{"c*", "1"}})})}}));
+    EXPECT_THAT(shown(), ElementsAre("/*b/0/c* [] 1"));
 }
 
 TEST_F(TreeTest, WhatTheNextDisplayLacksIsRemoved) {
