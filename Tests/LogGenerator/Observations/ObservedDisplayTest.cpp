@@ -3,34 +3,21 @@
 
 #include "LogGenerator/Extra/ExtraPayload.h"
 #include "LogGenerator/GSM/AssertionFailure.h"
-#include "Telephony/Drives/ScenarioRegistry.h"
+#include "Tests/LogGenerator/Observations/DecodedTechnology.h"
 #include "Tests/LogGenerator/Observations/DisplayCheck.h"
 #include "Tests/LogGenerator/Observations/RandomMessages.h"
-#include "Tests/Support/CapturedLog.h"
-#include "Tests/Support/FakeClock.h"
-#include "Tests/Support/FakeResources.h"
-#include "Tests/Support/ShippedResources.h"
 
 #include <gmock/gmock.h>
 
 #include <cstdio>
 #include <memory>
-#include <ostream>
+#include <string>
 
 // What a message's observations say is what the display shows of it, for every scenario and for messages that
 // no modem sends; and together they reach every row of the catalogue.
 
 namespace velmora {
 namespace {
-
-struct Decoded {
-    const char* scenario;
-    const char* resource; ///< the template; empty for none
-
-    friend std::ostream& operator<<(std::ostream& out, const Decoded& decoded) {
-        return out << decoded.scenario;
-    }
-};
 
 std::string hexText(Bytes bytes) {
     std::string text;
@@ -42,21 +29,10 @@ std::string hexText(Bytes bytes) {
     return text;
 }
 
-class ObservedDisplayTest : public testing::TestWithParam<Decoded> {
-    CapturedLog _log{LogPriority::Emergency};
-    FakeClock _clock;
-    FakeResources _resources;
+class ObservedDisplayTest : public testing::TestWithParam<DecodedTechnology> {
+    TechnologyUnderTest _tested{GetParam()};
 
 protected:
-    ObservedDisplayTest() {
-        const std::string resource = GetParam().resource;
-        if (!resource.empty())
-            _resources.put(resource, "plist", shippedResource(resource + ".plist"));
-        decoder = LogGenerator::generatorFromTechnology(makeScenario(1)->technology(), _clock);
-        decoder->setKeepsHistory(false);
-        check = std::make_unique<DisplayCheck>(*decoder);
-    }
-
     [[nodiscard]] static std::unique_ptr<Scenario> makeScenario(std::uint64_t seed) {
         return scenarioKindNamed(GetParam().scenario)->make(seed);
     }
@@ -72,16 +48,16 @@ protected:
     /// would otherwise be thousands.
     [[nodiscard]] bool expectObserved(const Data& message) {
         if (state["Display"].isNone()) // so that the template's own texts are there before the first message
-            static_cast<void>(decoder->generateLogUsingState(state));
-        check->mark(state);
+            static_cast<void>(decoder.generateLogUsingState(state));
+        check.mark(state);
         try {
-            decoder->updateState(state, message);
+            decoder.updateState(state, message);
         } catch (const LogCode_0xFF0000::UnknownDataException&) {
             return true;
         } catch (const AssertionFailure&) {
             return true;
         }
-        const std::vector<std::string> problems = check->problems(state);
+        const std::vector<std::string> problems = check.problems(state);
         if (problems.empty())
             return true;
         EXPECT_THAT(problems, testing::IsEmpty()) << "message " << hexText(message.bytes());
@@ -93,15 +69,15 @@ protected:
                 return;
     }
     void playRandom(std::uint64_t seed, std::size_t messages) {
-        RandomMessages random(*decoder, drive(seed, 4000), seed);
+        RandomMessages random(decoder, drive(seed, 4000), seed);
         for (std::size_t i = 0; i < messages; ++i)
             if (!expectObserved(random.next()))
                 return;
     }
 
-    std::unique_ptr<LogGenerator> decoder;
-    std::unique_ptr<DisplayCheck> check;
-    Dictionary state;
+    LogGenerator& decoder = _tested.decoder();
+    Dictionary& state = _tested.state;
+    DisplayCheck check{decoder};
 
 private:
     int _failures = 0;
@@ -120,21 +96,18 @@ TEST_P(ObservedDisplayTest, RandomMessagesObservationsAreWhatTheyShow) {
 TEST_P(ObservedDisplayTest, EveryRowOfTheCatalogueIsReached) {
     play(drive(1, 8000));
     playRandom(3, 8000);
-    for (const CatalogueField& field : decoder->catalogue().fields()) {
+    for (const CatalogueField& field : decoder.catalogue().fields()) {
         // A list that shows nothing until the first record of it: no record makes it empty again.
         if (field.path != "/1x/Active Set") {
-            EXPECT_TRUE(check->leaves().contains(&field)) << field.path;
+            EXPECT_TRUE(check.leaves().contains(&field)) << field.path;
         }
         for (const CatalogueSource& source : field.sources)
-            EXPECT_TRUE(check->sources().contains(&source))
+            EXPECT_TRUE(check.sources().contains(&source))
                 << field.path << " of 0x" << std::hex << source.code;
     }
 }
 
-INSTANTIATE_TEST_SUITE_P(Technologies, ObservedDisplayTest,
-                         testing::Values(Decoded{"gsm", "Ostrel_GSM"}, Decoded{"lte", "LTE"},
-                                         Decoded{"utran", "Ostrel_UTRAN"}, Decoded{"c2k", "C2KTemplate"},
-                                         Decoded{"ifx", ""}),
+INSTANTIATE_TEST_SUITE_P(Technologies, ObservedDisplayTest, testing::ValuesIn(decodedTechnologies),
                          [](const auto& decoded) { return std::string(decoded.param.scenario); });
 
 } // namespace
