@@ -3,6 +3,7 @@
 
 #include "Telephony/Drives/UTRAN/UTRANScenario.h"
 #include "Tests/LogGenerator/Observations/Truth/TruthTest.h"
+#include "Tests/Support/Hex.h"
 
 #include <algorithm>
 
@@ -56,6 +57,16 @@ TEST_F(UTRANTruthTest, WhatIsObservedIsWhatTheDriveMeant) {
             });
     expectCompared({Role::ServingArea, Role::ServingCell, Role::ServingChannel, Role::ServingPhysicalCell,
                     Role::NeighbourChannel, Role::NeighbourPhysicalCell, Role::RadioState});
+}
+
+TEST_F(UTRANTruthTest, AStateThatTheRecordLacksIsAbsent) {
+    decode(record(0xD0E0, "01 04"));
+    ASSERT_EQ(seen().size(), 1u);
+    EXPECT_EQ(seen()[0].raw, 4);
+    decode(record(0xD0E0, "01"));
+    EXPECT_TRUE(seen().empty());
+    decode(record(0xD0E0, "02 04")); // an unknown version
+    EXPECT_TRUE(seen().empty());
 }
 
 } // namespace
