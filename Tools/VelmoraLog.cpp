@@ -9,6 +9,7 @@
 #include "Tools/Convert/ConvertCommand.h"
 #include "Tools/Decode/DecodeCommand.h"
 #include "Tools/ExitStatus.h"
+#include "Tools/Fields/FieldsCommand.h"
 #include "Tools/Info/InfoCommand.h"
 #include "Tools/Output.h"
 #include "Tools/Record/RecordCommand.h"
@@ -75,6 +76,8 @@ int runVelmoraLog(int count, const char* const* arguments) {
         status = runInfo(*info, output);
     else if (const auto* convert = std::get_if<ConvertOptions>(&line.command))
         status = runConvert(*convert);
+    else if (const auto* fields = std::get_if<FieldsOptions>(&line.command))
+        status = runFields(*fields, output);
     setResources(nullptr);
     return status;
 }
