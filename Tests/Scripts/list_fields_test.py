@@ -52,6 +52,7 @@ class PlaceTest(unittest.TestCase):
             ("u9@21.3", place(21, 9, bit=3)),
             ("u10@14.0", place(14, 10)),
             ("u8@+1.1", place(1, 8, bit=1, in_entry=True)),
+            ("i8@2/10", {**place(10, 8, signed=True), "subPacket": 2}),
         ]:
             self.assertEqual(list_fields.place({"code": 1, "place": where}), expected)
 

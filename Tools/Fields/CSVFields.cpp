@@ -33,6 +33,10 @@ std::string placed(const Source& source, bool truth) {
     return source.field->place.isComputed() ? std::string() : truthText(truth);
 }
 
+std::string subPacket(const Source& source) {
+    return source.subPacket != 0 ? placed(source, unsigned{source.subPacket}) : std::string();
+}
+
 std::string physical(const Source& source, double SourceNumber::*part) {
     const Field& field = *source.field;
     return kindOf(field) == ObservedKind::Number ? numberText(numberOf(field).*part) : std::string();
@@ -80,6 +84,7 @@ constexpr SourceColumn sourceColumns[] = {
     {"place_big_endian",
      [](const Source& source) { return placed(source, source.field->place.isBigEndian); }},
     {"place_in_entry", [](const Source& source) { return placed(source, source.list != nullptr); }},
+    {"place_sub_packet", [](const Source& source) { return subPacket(source); }},
     {"physical_scale", [](const Source& source) { return physical(source, &SourceNumber::scale); }},
     {"physical_offset", [](const Source& source) { return physical(source, &SourceNumber::offset); }},
     {"enumeration", [](const Source& source) { return enumerationText(*source.field); }},

@@ -46,6 +46,8 @@ Value placeOf(const CatalogueSource& source) {
     object->set("signed", numberOf(*source.field).isSigned);
     object->set("bigEndian", place.isBigEndian);
     object->set("inEntry", source.list != nullptr);
+    if (source.subPacket != 0)
+        object->set("subPacket", source.subPacket);
     return object;
 }
 

@@ -42,6 +42,7 @@ constexpr Field network{"Network",
                          .clause = "3GPP TS 23.003 2.2"}};
 constexpr Field power{"Power", bitsAt(21, 0, 9), real("%4.2f dBm", 0.25, -140), {.sign = Sign::Signed}};
 constexpr Field rate{"Rate", u32At(30), integer("%d kbps")};
+constexpr Field gain{"AGC", u16At(10), integer("%u")};
 constexpr Field name{"Name", computed, plainText(), {.identity = Identity::Subscriber}};
 constexpr Field textLevel{"", computed, integer("%d dBm"), {.role = Role::ServingLevel}};
 
@@ -66,6 +67,7 @@ ExampleCatalogue::ExampleCatalogue() {
     CatalogueField& again = _catalogue.add(_catalogue.root().child("Rate"), "Status", {0xB17F, &rate});
     again.sameAs = "/Group/Power";
     _catalogue.add(_catalogue.root().child("Name"), "SIM Info", {0xFF0000, &name});
+    _catalogue.add(_catalogue.root().child("AGC"), "", {0x119C, &gain, nullptr, 2});
     CatalogueField& empty = _catalogue.leafAt(_catalogue.root().child("List"), "");
     empty.kind = ObservedKind::Absent;
     empty.absentTexts = {"", "(none)"};

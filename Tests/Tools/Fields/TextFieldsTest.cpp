@@ -21,6 +21,7 @@ TEST(TextFieldsTest, TablesOfTechnologiesHaveColumnsThatLineUp) {
               "  /Group/Power          number dBm                      0xB17F\n"
               "  /Rate                 number kbit/s                   0xB17F\n"
               "  /Name                 text                            0xFF0000\n"
+              "  /AGC                  number                          0x119C\n"
               "  /List                 absent\n"
               "\n"
               "IFX\n"
