@@ -5,6 +5,9 @@
 
 _velmora_technologies=(IFX Ostrel_GSM Ostrel_CDMA Ostrel_LTE Ostrel_UTRAN2)
 
+_velmora_roles=(serving serving.{mcc,mnc,area,cell,channel,physical-cell,level,quality} neighbour
+    neighbour.{channel,physical-cell,level,quality} registration.state radio.state block-error-rate data-rate)
+
 # Offers those of the words that begin as the present one does.
 _velmora_offer() {
     local word
@@ -82,7 +85,7 @@ _velmora_log() {
     for ((i = 1; i < cword; ++i)); do
         case ${words[i]} in
         --log | --log-level | --format | --every | --select | --from | --to | --code | --technology | --jobs | \
-            --duration | --count | --timeout | --description)
+            --duration | --count | --timeout | --description | --role)
             ((++i))
             ;;
         -?*) ;;
@@ -97,7 +100,15 @@ _velmora_log() {
     done
     case $prev in
     --format)
-        _velmora_offer text json jsonl csv
+        if [[ $command == fields ]]; then
+            _velmora_offer text json csv
+        else
+            _velmora_offer text json jsonl csv
+        fi
+        return
+        ;;
+    --role)
+        _velmora_offer "${_velmora_roles[@]}"
         return
         ;;
     --every)
@@ -120,7 +131,7 @@ _velmora_log() {
         if [[ $cur == -* ]]; then
             _velmora_offer "${options[@]}" --version
         else
-            _velmora_offer decode watch record convert info
+            _velmora_offer decode watch record convert info fields
         fi
         return
         ;;
@@ -129,6 +140,7 @@ _velmora_log() {
     record) options+=(--force --duration --count --timeout) ;;
     convert) options+=(--force --from --to --code --technology --description --strict) ;;
     info) options+=(--technology) ;;
+    fields) options+=(--technology --role --format) ;;
     esac
     if [[ $cur == -* ]]; then
         _velmora_offer "${options[@]}"
