@@ -7,6 +7,7 @@
 #include "Recording/MessageReader.h"
 #include "Telephony/Drives/ScenarioRegistry.h"
 #include "Tools/Decode/DecodeWriter.h"
+#include "Tools/Decode/Samples/SampleColumns.h"
 #include "Tools/Output.h"
 #include "Tools/Report.h"
 #include "Tools/Text/JSONText.h"
@@ -118,9 +119,10 @@ void decodeDrive(benchmark::State& state) {
         Output output(nowhere);
         WorkContext context("drive");
         DriveReader reader(kind, count);
+        SampleColumns columns;
         for (auto step : state) {
             reader.rewind();
-            const std::unique_ptr<DecodeWriter> writer = DecodeWriter::make(options, 0, false, output);
+            const std::unique_ptr<DecodeWriter> writer = DecodeWriter::make(options, 0, false, columns, output);
             const Result<DecodedFile> decoded = decodeMessages(reader, {}, context, *writer);
             if (!decoded)
                 std::abort();
