@@ -75,6 +75,7 @@ private:
     bool _isOpen = false;
     std::span<const std::string_view> _keys;
     std::vector<std::unique_ptr<CatalogueNode>> _children;
+    std::map<std::string_view, CatalogueNode*> _byName; ///< the children: a free tree may have very many
 };
 
 /// A leaf of the display: one row of the catalogue.

@@ -167,6 +167,17 @@ TEST_F(TreeTest, ANumberInAnotherUnitIsAbsent) {
     EXPECT_EQ(textOf(only()), "none");
 }
 
+// Their number must not square the time.
+TEST_F(TreeTest, ADisplayMayHaveVeryManyLabels) {
+    const DictionaryRef many = makeDictionary();
+    constexpr int count = 100'000;
+    for (int i = 0; i < count; ++i)
+        many->set("Label " + std::to_string(i), "1");
+    show(many);
+    EXPECT_EQ(observations().size(), static_cast<std::size_t>(count));
+    EXPECT_EQ(observations().back().leaf->path, "/Label 99999");
+}
+
 TEST_F(TreeTest, OnlyAKeyThatIsAStarNamesRows) {
     show(dictionary({{"*b", array({dictionary({{"c*", "1"}})})}}));
     EXPECT_THAT(shown(), ElementsAre("/*b/0/c* [] 1"));

@@ -1,8 +1,12 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
+#include "LogMessages/LogMessage.h"
+#include "LogMessages/Record.h"
 #include "Telephony/Drives/C2K/C2KScenario.h"
 #include "Tests/LogGenerator/Observations/Truth/TruthTest.h"
+
+#include <optional>
 
 namespace velmora {
 namespace {
@@ -56,6 +60,43 @@ TEST_F(C2KTruthTest, WhatIsObservedIsWhatTheDriveMeant) {
             });
     expectCompared({Role::ServingCell, Role::ServingChannel, Role::ServingPhysicalCell, Role::ServingLevel,
                     Role::RadioState});
+}
+
+/// What has been sent on the forward link up to a record, by its counters of packets of 1024, 2048 and 4096
+/// bits.
+struct Sent {
+    double seconds;
+    double bits;
+};
+
+std::optional<Sent> sentBy(const Data& message) {
+    constexpr std::size_t length = 241;
+    const std::optional<LogMessage> parsed = LogMessage::parse(message.bytes());
+    if (!parsed || parsed->type != LogMessage::basebandType || parsed->code != 0x1192 ||
+        parsed->record.size() < length)
+        return std::nullopt;
+    const Record record(parsed->record);
+    return Sent{static_cast<double>(record.u32(13)),
+                1024.0 * record.u32(29) + 2048.0 * record.u32(125) + 4096.0 * record.u32(197)};
+}
+
+TEST_F(C2KTruthTest, ADataRateIsTheBitsOfASecond) {
+    C2KScenario scenario(1);
+    std::optional<Sent> before;
+    for (int i = 0; i < 6000; ++i) {
+        const Data message = scenario.next().message;
+        decode(message);
+        const std::optional<Sent> now = sentBy(message);
+        if (!now)
+            continue;
+        for (const Seen& each : seen())
+            if (each.role == Role::DataRate && before && now->seconds > before->seconds) {
+                const double rate = (now->bits - before->bits) / (now->seconds - before->seconds) / 1000;
+                expectNumber(each, rate, 0.001 * rate);
+            }
+        before = now;
+    }
+    expectCompared({Role::DataRate});
 }
 
 } // namespace
