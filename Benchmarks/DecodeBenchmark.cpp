@@ -122,7 +122,8 @@ void decodeDrive(benchmark::State& state) {
         SampleColumns columns;
         for (auto step : state) {
             reader.rewind();
-            const std::unique_ptr<DecodeWriter> writer = DecodeWriter::make(options, 0, false, columns, output);
+            const std::unique_ptr<DecodeWriter> writer =
+                DecodeWriter::make(options, 0, false, columns, output);
             const Result<DecodedFile> decoded = decodeMessages(reader, {}, context, *writer);
             if (!decoded)
                 std::abort();
