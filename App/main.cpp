@@ -33,7 +33,7 @@ constexpr auto serviceDelay = 3s;
 struct Options {
     LinuxFileSystem::Options files;
     LogKind log = LogKind::Syslog;
-    int logLevel = LogPriority::Notice;
+    int logLevel = LogPriority::Error;
     bool isSelfTest = false;
     bool startsService = false;
 };
@@ -84,7 +84,7 @@ int show(const Options& options, char* program) {
     }
     app.platform().model().queue.after(serviceDelay, [&app] {
         if (!app.model().isConnected())
-            logLine(LogPriority::Notice,
+            logLine(LogPriority::Error,
                     "no telephony service answers; the installed one is started by: velmora --start-service, "
                     "one with a synthetic drive by: velmora-telephonyd --source scenario:gsm,seed=1");
     });

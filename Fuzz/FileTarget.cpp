@@ -4,6 +4,7 @@
 #include "Fuzz/FuzzTargets.h"
 #include "Recording/DLF/DLFReader.h"
 #include "Recording/Pcapng/PcapngReader.h"
+#include "Recording/Pcapng/RecordingCopy.h"
 #include "Recording/Snapshots/SnapshotReader.h"
 #include "Tests/Recording/PcapngFile.h"
 
@@ -40,6 +41,25 @@ bool same(const Contents& a, const Contents& b) {
            std::equal(a.losses.begin(), a.losses.end(), b.losses.begin(), b.losses.end(), sameLoss);
 }
 
+/// A file in memory.
+class MemoryFile final : public OutputFile {
+public:
+    explicit MemoryFile(std::vector<std::uint8_t>& bytes) : _bytes(bytes) {}
+    Written write(Bytes bytes) override {
+        _bytes.insert(_bytes.end(), bytes.begin(), bytes.end());
+        return {bytes.size(), 0};
+    }
+    [[nodiscard]] bool isRegular() const override { return false; }
+    int truncateTo(std::uint64_t) override { return 0; }
+    void startSync() override {}
+    std::optional<int> takeSyncResult() override { return std::nullopt; }
+    int sync() override { return 0; }
+    int close() override { return 0; }
+
+private:
+    std::vector<std::uint8_t>& _bytes;
+};
+
 /// The input's first byte sets the size of the source's reads from the rest, which is a file of the reader's
 /// form. `hasOffsets`: offsets are positions in the file, and messages its bytes.
 template <class Reader>
@@ -57,6 +77,9 @@ public:
         expectOrder(whole);
         if (_hasOffsets)
             expectInside(whole, file.bytes());
+        if constexpr (std::is_same_v<Reader, PcapngReader>)
+            if (whole.failure.empty())
+                expectSameInCopy(whole, file);
     }
 
 private:
@@ -77,6 +100,24 @@ private:
         contents.losses = (*reader)->losses();
         contents.totals = (*reader)->lossTotals();
         return contents;
+    }
+
+    /// A copy of the recording has the same messages, at other offsets.
+    static void expectSameInCopy(const Contents& whole, const Data& file) {
+        const auto reader = PcapngReader::open(ChunkedInput(std::make_unique<MemorySource>(file)));
+        std::vector<std::uint8_t> bytes;
+        RecordingCopy copy(**reader, std::make_unique<MemoryFile>(bytes), "the copy");
+        while ((*reader)->next())
+            require(bool(copy.addMessage()), "memory can be written");
+        require(bool(copy.finish()), "memory can be written");
+        Contents copied = read(Data(std::move(bytes)), SIZE_MAX);
+        require(copied.failure.empty() && copied.technology == whole.technology &&
+                    copied.messages.size() == whole.messages.size(),
+                "a copy has the messages of its recording");
+        for (std::size_t i = 0; i < whole.messages.size(); ++i)
+            require(copied.messages[i].time == whole.messages[i].time &&
+                        copied.messages[i].message == whole.messages[i].message,
+                    "a copied message is the same");
     }
 
     static void expectOrder(const Contents& contents) {

@@ -6,6 +6,7 @@
 #include "Platform/Bytes.h"
 #include "Platform/Clock.h"
 #include "Platform/Result.h"
+#include "Recording/Comments.h"
 
 #include <cstddef>
 #include <cstdint>
@@ -77,16 +78,20 @@ public:
     [[nodiscard]] const std::vector<Loss>& losses() const { return _losses; }
     /// All losses so far.
     [[nodiscard]] const LossTotals& lossTotals() const { return _lossTotals; }
+    /// The comments so far.
+    [[nodiscard]] const Comments& comments() const { return _comments; }
 
 protected:
     MessageReader() = default;
     /// Whether the next loss will be kept, so that its reason is worth composing.
     [[nodiscard]] bool keepsLoss() const { return _losses.size() < maximumLosses; }
     void addLoss(Loss loss);
+    void addComment(Comment comment) { _comments.add(std::move(comment)); }
 
 private:
     std::vector<Loss> _losses;
     LossTotals _lossTotals;
+    Comments _comments;
 };
 
 } // namespace velmora

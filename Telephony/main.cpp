@@ -32,7 +32,7 @@ constexpr const char* program = "velmora-telephonyd";
 struct Options {
     std::string source;
     velmora::LogKind log = velmora::LogKind::Stderr;
-    int logLevel = velmora::LogPriority::Notice;
+    int logLevel = velmora::LogPriority::Error;
 };
 
 void declare(CLI::App& app, Options& options) {

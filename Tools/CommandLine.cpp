@@ -50,6 +50,9 @@ CommandLine parseCommandLine(int count, const char* const* arguments) {
                    "The least urgent log lines that are written, 0 to 7; the default is 3")
         ->check(validLogLevel())
         ->type_name("N");
+    app.add_flag("-v,--verbose", line.verbose,
+                 "Write each log line of a decoder as it arises, not their sum at the end, and those that "
+                 "report its start and end");
     app.footer("Exit status: 0 done, 1 the input was bad, 2 usage.\n\n"
                "Examples:\n"
                "  velmora-log watch\n"

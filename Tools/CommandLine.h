@@ -26,6 +26,8 @@ struct CommandLine {
 
     LogKind log = LogKind::Stderr;
     int logLevel = LogPriority::Error;
+    bool verbose =
+        false; ///< decoder lines as they arise, not summed up; those of objects made and destroyed too
     std::variant<Notice, DecodeOptions, WatchOptions, RecordOptions, ConvertOptions, InfoOptions> command;
 };
 

@@ -33,6 +33,10 @@ DeferredLog::~DeferredLog() {
 }
 
 void DeferredLog::write(int priority, std::string_view text) {
+    if (_released) {
+        pass(priority, text);
+        return;
+    }
     if (_lines.size() == maximumLines) {
         _lines.pop_front();
         ++_leftOut;
@@ -41,6 +45,7 @@ void DeferredLog::write(int priority, std::string_view text) {
 }
 
 void DeferredLog::release() {
+    _released = true;
     if (_leftOut != 0)
         pass(LogPriority::Error, std::to_string(_leftOut) + " earlier lines left out");
     for (const auto& [priority, text] : _lines)
@@ -49,7 +54,7 @@ void DeferredLog::release() {
     _lines.clear();
     if (_console) {
         std::fflush(_console);
-        std::fwrite(_consoleText, 1, _consoleSize, stderr);
+        std::fwrite(_consoleText, 1, _consoleSize, _earlierConsole ? _earlierConsole : stdout);
         std::rewind(_console);
     }
 }

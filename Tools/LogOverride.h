@@ -39,12 +39,13 @@ public:
     DeferredLog();
     ~DeferredLog() override;
     void write(int priority, std::string_view text) override;
-    /// Writes the deferred lines now.
+    /// Writes the deferred lines now, and later ones as they arise.
     void release();
 
 private:
     std::deque<std::pair<int, std::string>> _lines;
     std::size_t _leftOut = 0;
+    bool _released = false;
     char* _consoleText = nullptr;
     std::size_t _consoleSize = 0;
     std::FILE* _console;

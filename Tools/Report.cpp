@@ -65,7 +65,7 @@ void WorkContext::terminate() noexcept {
     // Allocates nothing, since memory may be exhausted.
     const char* const reason = terminationReason();
     const WorkContext* const context = currentContext;
-    if (!context)
+    if (!context || context->_title.empty())
         std::snprintf(lastWords, sizeof lastWords, "velmora-log: %s\n", reason);
     else if (context->_number == 0)
         std::snprintf(lastWords, sizeof lastWords, "velmora-log: %s: %s\n", context->_title.c_str(), reason);
@@ -75,8 +75,9 @@ void WorkContext::terminate() noexcept {
                       context->_title.c_str(), context->_number, context->_offset, reason);
     // A failure while cleaning up must not come back here.
     std::set_terminate([] { endSaying(lastWords); });
-    if (context && context->_cleanUp)
-        context->_cleanUp();
+    for (const WorkContext* each = context; each; each = each->_earlier)
+        if (each->_cleanUp)
+            each->_cleanUp();
     endSaying(lastWords);
 }
 

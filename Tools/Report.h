@@ -26,7 +26,8 @@ void report(std::string_view text);
 /// the decoders are meant to end the program and are caught nowhere. The latest one counts. Main thread only.
 class WorkContext {
 public:
-    /// `title`: a file, or the service. `cleanUp` runs before the program ends that way.
+    /// `title`: a file, or the service, or empty. `cleanUp` runs before the program ends that way, and before
+    /// those of the contexts around this one.
     explicit WorkContext(std::string title, std::function<void()> cleanUp = {});
     ~WorkContext();
     WorkContext(const WorkContext&) = delete;

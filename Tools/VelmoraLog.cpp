@@ -10,6 +10,8 @@
 #include "Tools/Decode/DecodeCommand.h"
 #include "Tools/ExitStatus.h"
 #include "Tools/Info/InfoCommand.h"
+#include "Tools/Log/DecoderLog.h"
+#include "Tools/Log/QuietConsole.h"
 #include "Tools/Output.h"
 #include "Tools/Record/RecordCommand.h"
 #include "Tools/Report.h"
@@ -17,6 +19,7 @@
 
 #include <csignal>
 #include <cstdio>
+#include <optional>
 
 #include <fcntl.h>
 #include <unistd.h>
@@ -46,6 +49,19 @@ int say(const CommandLine::Notice& words, Output& output) {
     return output.state() == Output::State::Failed ? ExitStatus::BadInput : words.status;
 }
 
+int run(const CommandLine& line, DecoderLines& lines, Output& output) {
+    if (const auto* decode = std::get_if<DecodeOptions>(&line.command))
+        return runDecode(*decode, lines, output);
+    if (const auto* watch = std::get_if<WatchOptions>(&line.command))
+        return runWatch(*watch, lines, output);
+    if (const auto* record = std::get_if<RecordOptions>(&line.command))
+        return runRecord(*record, lines);
+    const DecoderLog log(lines);
+    if (const auto* info = std::get_if<InfoOptions>(&line.command))
+        return runInfo(*info, output);
+    return runConvert(std::get<ConvertOptions>(line.command));
+}
+
 } // namespace
 
 int runVelmoraLog(int count, const char* const* arguments) {
@@ -64,17 +80,12 @@ int runVelmoraLog(int count, const char* const* arguments) {
     const ProgramLog log(line.log, line.logLevel, "velmora-log");
     FileResources files;
     setResources(&files);
-    int status = ExitStatus::Done;
-    if (const auto* decode = std::get_if<DecodeOptions>(&line.command))
-        status = runDecode(*decode, output);
-    else if (const auto* watch = std::get_if<WatchOptions>(&line.command))
-        status = runWatch(*watch, output);
-    else if (const auto* record = std::get_if<RecordOptions>(&line.command))
-        status = runRecord(*record);
-    else if (const auto* info = std::get_if<InfoOptions>(&line.command))
-        status = runInfo(*info, output);
-    else if (const auto* convert = std::get_if<ConvertOptions>(&line.command))
-        status = runConvert(*convert);
+    DecoderLines lines(line.verbose);
+    const std::optional<QuietConsole> console =
+        line.verbose ? std::nullopt : std::make_optional<QuietConsole>();
+    const WorkContext context({}, [&lines] { lines.report(); });
+    const int status = run(line, lines, output);
+    lines.report();
     setResources(nullptr);
     return status;
 }

@@ -4,6 +4,7 @@
 #include "Recording/Pcapng/InterfaceDescription.h"
 
 #include "Recording/Pcapng/ByteReader.h"
+#include "Recording/Pcapng/OptionReader.h"
 #include "Recording/Pcapng/Pcapng.h"
 
 #include <algorithm>
@@ -17,7 +18,6 @@ __extension__ using Wide = __int128;
 
 constexpr Wide nanosecondsPerSecond = 1'000'000'000;
 constexpr std::size_t fixedPart = 8;
-constexpr std::size_t optionHeader = 4;
 constexpr std::size_t maximumName = 255;
 constexpr std::uint8_t powerOfTwo = 0x80;
 
@@ -41,31 +41,26 @@ std::optional<InterfaceDescription> InterfaceDescription::read(Bytes body, bool 
     InterfaceDescription description;
     description.linkType = fields.u16(0);
     description.snapLength = fields.u32(4);
-    std::size_t at = fixedPart;
-    while (at < body.size()) {
-        const std::uint16_t option = fields.u16(at);
-        const std::size_t length = fields.u16(at + 2);
-        const std::size_t value = at + optionHeader;
-        if (!fields.isGood() || option == pcapng::Option::End)
-            break;
-        if (length > body.size() - value) // the option's header lies inside
-            return std::nullopt;
-        if (option == pcapng::Option::InterfaceName) {
-            const Bytes name = body.subspan(value, std::min(length, maximumName));
+    if (!fields.isGood())
+        return std::nullopt;
+    OptionReader options(body.subspan(fixedPart), bigEndian);
+    while (const auto option = options.next()) {
+        const Bytes value = option->value;
+        if (option->code == pcapng::Option::InterfaceName) {
+            const Bytes name = value.first(std::min(value.size(), maximumName));
             // Some writers end the text with a zero, which the format does not require.
             description.name.assign(name.begin(), std::find(name.begin(), name.end(), std::uint8_t{0}));
-        } else if (option == pcapng::Option::TimeResolution) {
-            if (length != 1)
+        } else if (option->code == pcapng::Option::TimeResolution) {
+            if (value.size() != 1)
                 return std::nullopt;
-            description.timeResolution = body[value];
-        } else if (option == pcapng::Option::TimeOffset) {
-            if (length != 8)
+            description.timeResolution = value[0];
+        } else if (option->code == pcapng::Option::TimeOffset) {
+            if (value.size() != 8)
                 return std::nullopt;
-            description.timeOffset_seconds = static_cast<std::int64_t>(fields.u64(value));
+            description.timeOffset_seconds = static_cast<std::int64_t>(ByteReader(value, bigEndian).u64(0));
         }
-        at = value + pcapng::padded(length);
     }
-    if (!fields.isGood())
+    if (options.isDamaged())
         return std::nullopt;
     return description;
 }

@@ -26,6 +26,7 @@ inline constexpr std::uint32_t CustomNotCopied = 0x40000BAD;
 
 namespace Option {
 inline constexpr std::uint16_t End = 0;
+inline constexpr std::uint16_t Comment = 1;
 inline constexpr std::uint16_t SectionUserApplication = 4;
 inline constexpr std::uint16_t InterfaceName = 2;
 inline constexpr std::uint16_t TimeResolution = 9;

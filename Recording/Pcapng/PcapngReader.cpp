@@ -6,6 +6,7 @@
 #include "Platform/TelephonyService.h"
 #include "Recording/Files/FileSource.h"
 #include "Recording/Pcapng/ByteReader.h"
+#include "Recording/Pcapng/OptionReader.h"
 #include "Recording/Pcapng/Pcapng.h"
 
 #include <algorithm>
@@ -20,6 +21,10 @@ namespace BlockType = pcapng::BlockType;
 constexpr std::size_t maximumInterfaces = 65'536;
 constexpr std::uint16_t supportedMajorVersion = 1;
 constexpr std::size_t versionOffset = 12;
+constexpr std::size_t sectionOptionsOffset = 24;
+constexpr std::size_t interfaceOptionsOffset = 16;
+/// How much is read to open a file, in bytes of blocks, which are kept for `setOtherBlocks`.
+constexpr std::size_t maximumHead = std::size_t{1} << 20;
 
 bool holdsPacket(std::uint32_t type) {
     return type == BlockType::EnhancedPacket || type == BlockType::SimplePacket || type == BlockType::Packet;
@@ -38,7 +43,7 @@ Result<std::unique_ptr<PcapngReader>> PcapngReader::open(ChunkedInput input) {
     std::unique_ptr<PcapngReader> reader(new PcapngReader(std::move(input)));
     if (const Result<Done> section = reader->_blocks.expectSection(); !section)
         return Failure{section.reason()};
-    while (!reader->_foundInterface) {
+    while (!reader->_foundInterface && reader->_headSize < maximumHead) {
         const Block* const block = reader->nextBlock();
         if (!block)
             break;
@@ -48,10 +53,29 @@ Result<std::unique_ptr<PcapngReader>> PcapngReader::open(ChunkedInput input) {
         }
         reader->readBlock(*block);
     }
+    reader->_isOpening = false;
     return reader;
 }
 
+void PcapngReader::setOtherBlocks(std::function<void(const Block&)> otherBlocks) {
+    _otherBlocks = std::move(otherBlocks);
+    for (auto& [block, bytes] : std::exchange(_head, {})) {
+        block.bytes = bytes;
+        _otherBlocks(block);
+    }
+}
+
+void PcapngReader::passOn(const Block& block) {
+    if (_otherBlocks) {
+        _otherBlocks(block);
+    } else if (_isOpening) {
+        _head.emplace_back(block, std::vector(block.bytes.begin(), block.bytes.end()));
+        _headSize += block.bytes.size();
+    }
+}
+
 std::optional<LoggedMessage> PcapngReader::next() {
+    _head.clear();
     std::optional<LoggedMessage> message; // made where it is returned: there are millions of them
     while (!message) {
         const Block* const block = _waiting ? std::exchange(_waiting, nullptr) : nextBlock();
@@ -80,6 +104,7 @@ void PcapngReader::readBlock(const Block& block) {
         addInterface(block);
     } else if (block.type == BlockType::SectionHeader) {
         _interfaces.clear();
+        readComments(block, sectionOptionsOffset, Comment::About::Section, ++_sectionCount);
         ByteReader fields(block.bytes, block.bigEndian);
         // What follows is read as far as it can be understood all the same.
         if (const std::uint16_t major = fields.u16(versionOffset); major != supportedMajorVersion)
@@ -87,10 +112,24 @@ void PcapngReader::readBlock(const Block& block) {
                       "section of format version " + std::to_string(major) + ", wanted " +
                           std::to_string(supportedMajorVersion));
     }
+    passOn(block);
+}
+
+void PcapngReader::readComments(const Block& block, std::size_t options, Comment::About about,
+                                std::uint64_t number) {
+    const std::size_t end = block.length - 4;
+    if (options >= end)
+        return;
+    OptionReader reader(block.bytes.first(end).subspan(options), block.bigEndian);
+    while (const auto option = reader.next())
+        if (option->code == pcapng::Option::Comment)
+            addComment(
+                {about, number, block.offset, std::string(option->value.begin(), option->value.end())});
 }
 
 void PcapngReader::addInterface(const Block& block) {
     using Use = Interface::Use;
+    readComments(block, interfaceOptionsOffset, Comment::About::Interface, ++_interfaceCount);
     if (_interfaces.size() == maximumInterfaces) {
         addLossOf(block, _packets + 1,
                   "more than " + std::to_string(maximumInterfaces) + " interfaces in a section");
@@ -148,20 +187,29 @@ void PcapngReader::readMessage(const Block& block, std::optional<LoggedMessage>&
         packet.interface < _interfaces.size() ? &_interfaces[packet.interface] : nullptr;
     if (interface != nullptr && interface->use == Use::OtherLinkType) {
         ++_passedOver.packets;
+        passOn(block);
         return;
     }
+    const bool isOther = interface != nullptr && (interface->use == Use::OtherTechnology ||
+                                                  (interface->technology != 0 && !_readsAllTechnologies));
+    if (isOther)
+        passOn(block);
     const std::size_t room = block.length - 4;
     const bool whole = packet.offset <= room && packet.captured <= room - packet.offset &&
                        packet.captured == packet.original && packet.captured <= maximumMessageSize;
     std::optional<Time> time;
-    if (interface != nullptr && interface->use == Use::Messages && whole &&
-        (interface->technology == 0 || _readsAllTechnologies))
+    if (interface != nullptr && interface->use == Use::Messages && whole && !isOther)
         time = packet.hasStamp ? interface->description.time(packet.stamp) : _lastTime;
     if (!time) {
         // Thousands of these are possible; only those that are kept need a reason.
         addLossOf(block, number, keepsLoss() ? packetProblem(packet, block) : std::string());
         return;
     }
+    // Most packets have no options.
+    const std::size_t options = packet.offset + pcapng::padded(packet.captured);
+    if (block.type != BlockType::SimplePacket && options < room)
+        readComments(block, options, Comment::About::Message, number);
+    _messageBlock = &block;
     _lastTime = *time;
     LoggedMessage& made = message.emplace();
     made.time = *time;

@@ -10,6 +10,7 @@
 
 #include <cstddef>
 #include <cstdint>
+#include <functional>
 #include <memory>
 #include <optional>
 #include <string>
@@ -30,6 +31,9 @@ namespace velmora {
 /// Where a block is damaged, reading resumes at the next block that is not. Memory is bounded for any
 /// content; a message is a window on the reader's chunk and keeps that alive: copy messages that are kept for
 /// long. A message's number is the packet's in the file, as capture tools count. Main thread only.
+///
+/// For a copy of the file, `setOtherBlocks` gives what is neither a message nor lost, and `block` the block
+/// of a message.
 class PcapngReader final : public MessageReader {
 public:
     /// What was skipped because it is not a log message.
@@ -54,9 +58,17 @@ public:
     [[nodiscard]] const std::optional<Failure>& failure() const override { return _blocks.failure(); }
     [[nodiscard]] const PassedOver& passedOver() const { return _passedOver; }
 
-private:
     using Block = BlockReader::Block;
+    /// Passes on all blocks that hold no message and are not damaged, in the file's order between the
+    /// messages: section headers, interface descriptions, blocks that are not known here, packets of other
+    /// link types and technologies. Call it before the first `next`; it gets those that have been read to
+    /// open the file at once.
+    void setOtherBlocks(std::function<void(const Block&)> otherBlocks);
+    /// The block of the message that `next` last returned, until the next call. Precondition: it returned
+    /// one.
+    [[nodiscard]] const Block& block() const { return *_messageBlock; }
 
+private:
     struct Interface {
         enum class Use : std::uint8_t { Messages, OtherTechnology, OtherLinkType, Unreadable };
         Use use = Use::Messages;
@@ -81,6 +93,9 @@ private:
     [[nodiscard]] std::optional<std::uint32_t> technologyIndex(std::string_view name);
     void readBlock(const Block& block);
     void addInterface(const Block& block);
+    /// Adds the comments among the block's options, which begin at that offset of it.
+    void readComments(const Block& block, std::size_t options, Comment::About about, std::uint64_t number);
+    void passOn(const Block& block);
     /// Reads a packet's message, unless the packet is ignored or a loss.
     void readMessage(const Block& block, std::optional<LoggedMessage>& message);
     [[nodiscard]] Packet packetOf(const Block& block) const;
@@ -88,7 +103,15 @@ private:
     void addLossOf(const Block& block, std::uint64_t number, std::string reason);
 
     BlockReader _blocks;
-    const Block* _waiting = nullptr;                       ///< the packet that `open` stopped at
+    const Block* _waiting = nullptr; ///< the packet that `open` stopped at
+    const Block* _messageBlock = nullptr;
+    /// Copies of the blocks that `open` read, until there is somewhere to pass them on to.
+    std::vector<std::pair<Block, std::vector<std::uint8_t>>> _head;
+    std::size_t _headSize = 0;
+    bool _isOpening = true;
+    std::function<void(const Block&)> _otherBlocks;
+    std::uint64_t _sectionCount = 0;
+    std::uint64_t _interfaceCount = 0;                     ///< in all sections
     std::vector<Interface> _interfaces;                    ///< of the present section
     bool _foundInterface = false;                          ///< an interface of log messages has been read
     std::vector<std::string> _technologies{std::string()}; ///< the first is empty while none has been named

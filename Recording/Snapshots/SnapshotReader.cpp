@@ -79,6 +79,8 @@ Result<std::unique_ptr<SnapshotReader>> SnapshotReader::open(ChunkedInput input)
 SnapshotReader::SnapshotReader(const Dictionary& snapshot)
     : _entries(snapshot["Data"].arrayRef()),
       _timestamp(velmora::timeOf(snapshot["Timestamp"]).value_or(Time())) {
+    if (const std::string* text = snapshot["Description"].asString(); text && !text->empty())
+        addComment({Comment::About::Snapshot, 0, 0, *text});
     if (!_entries)
         return;
     for (const Value& entry : *_entries) {

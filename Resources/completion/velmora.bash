@@ -114,7 +114,7 @@ _velmora_log() {
     esac
     $split && return
 
-    local options=(-h --help --log --log-level)
+    local options=(-h --help --log --log-level -v --verbose)
     case $command in
     '')
         if [[ $cur == -* ]]; then

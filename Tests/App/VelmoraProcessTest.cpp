@@ -136,7 +136,7 @@ TEST_F(VelmoraProcessTest, WithoutAServiceTheLogSaysHowToStartOne) {
     const auto app = start("velmora", {"--log", "stderr"});
     EXPECT_TRUE(eventually([&] {
         return text("velmora.err")
-                   .find("<5>no telephony service answers; the installed one is started by: velmora "
+                   .find("<3>no telephony service answers; the installed one is started by: velmora "
                          "--start-service, one with a synthetic drive by: velmora-telephonyd --source "
                          "scenario:gsm,seed=1\n") != std::string::npos;
     })) << text("velmora.err");
@@ -155,7 +155,8 @@ TEST_F(VelmoraProcessTest, BringsUpTheServiceWhereNoneIsRunning) {
     const std::string started =
         "<5>started " VELMORA_BUILD_DIR "/velmora-telephonyd --source scenario:gsm,seed=1 as process ";
     for (const bool isFirst : {true, false}) {
-        const auto app = start("velmora", {"--start-service", "--self-test", "--log", "stderr"});
+        const auto app =
+            start("velmora", {"--start-service", "--self-test", "--log", "stderr", "--log-level", "5"});
         EXPECT_EQ(exitStatus(*app), 0) << text("velmora.err");
         // The first attempt to connect succeeds.
         EXPECT_THAT(text("velmora.err"), Not(HasSubstr("Could not create the ports")));
@@ -183,7 +184,8 @@ TEST_F(VelmoraProcessTest, LeavesTheServiceToTheServiceManagerWhereThereIsOne) {
     environment.insert("HOME", path("."));
     environment.insert("XDG_RUNTIME_DIR", path("."));
     environment.insert("PATH", path("bin") + ":/usr/bin:/bin");
-    const auto app = start("velmora", {"--start-service", "--self-test", "--log", "stderr"});
+    const auto app =
+        start("velmora", {"--start-service", "--self-test", "--log", "stderr", "--log-level", "5"});
     EXPECT_EQ(exitStatus(*app), 0) << text("velmora.err");
     startedService = processIn(text("service"), "");
     EXPECT_EQ(text("asked"), "--user --quiet start velmora-telephonyd.service\n");

@@ -53,7 +53,8 @@ def last_display(build: Path, recording: Path) -> bytes:
         own = environment(VELMORA_PORT_DIR=str(ports))
         processes: list[subprocess.Popen[bytes]] = []
         try:
-            service = [str(build / "velmora-telephonyd"), "--source", f"replay:{recording},speed=max"]
+            service = [str(build / "velmora-telephonyd"), "--source", f"replay:{recording},speed=max",
+                       "--log-level", "5"]
             with told.open("wb") as file:
                 processes.append(subprocess.Popen(service, stdout=subprocess.DEVNULL, stderr=file, env=own))
             wait_for("the service", told, b"serving ")

@@ -27,7 +27,7 @@ using Words = std::set<std::string>;
 const char* const programs[] = {"velmora", "velmora-telephonyd", "velmora-log"};
 
 /// What all commands of velmora-log take, but `--version`.
-const Words commonOptions = {"--help", "--log", "--log-level"};
+const Words commonOptions = {"--help", "--log", "--log-level", "--verbose"};
 
 Words wordsOf(const std::string& text, const std::string& expression) {
     const std::vector<std::string> found = allMatches(text, expression);

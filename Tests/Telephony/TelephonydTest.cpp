@@ -49,7 +49,7 @@ protected:
 
 TEST_F(TelephonydTest, streamsTheScenarioAndStopsCleanly) {
     for (const int signalNumber : {SIGTERM, SIGINT}) {
-        const auto service = start({"--source", "scenario:gsm,seed=3,speed=100"});
+        const auto service = start({"--source", "scenario:gsm,seed=3,speed=100", "--log-level", "5"});
         TestClient client(directory.path(), "com.velmora.test.client");
         ASSERT_TRUE(client.connect()) << service->standardError();
         EXPECT_EQ(client.technology(), "kVoxLogChannelTechnology_Ostrel_GSM");
@@ -95,7 +95,7 @@ TEST_F(TelephonydTest, takesItsSourceFromTheEnvironmentToo) {
 }
 
 TEST_F(TelephonydTest, survivesAClientThatIsKilled) {
-    const auto service = start({"--source", "scenario:gsm,speed=20"});
+    const auto service = start({"--source", "scenario:gsm,speed=20", "--log-level", "5"});
     TestClient other(directory.path(), "com.velmora.test.other");
     ASSERT_TRUE(other.connect());
     ASSERT_TRUE(other.stream());
@@ -152,7 +152,7 @@ TEST_F(TelephonydTest, replaysAFileAsFastAsItsClientTakesItAndLosesNothing) {
     }
     ASSERT_TRUE((*writer)->close());
 
-    const auto service = start({"--source", "replay:" + path + ",speed=max"});
+    const auto service = start({"--source", "replay:" + path + ",speed=max", "--log-level", "5"});
     TestClient client(directory.path(), "com.velmora.test.client");
     ASSERT_TRUE(client.connect());
     EXPECT_EQ(client.technology(), "kVoxLogChannelTechnology_Ostrel_LTE");

@@ -85,6 +85,13 @@ TEST(CommandLineTest, LogOptionsMayPrecedeOrFollowTheCommand) {
     }
 }
 
+TEST(CommandLineTest, VerboseMayPrecedeOrFollowTheCommand) {
+    for (const auto& arguments :
+         {std::vector<const char*>{"-v", "info", "a"}, std::vector<const char*>{"info", "--verbose", "a"}})
+        EXPECT_TRUE(parse(arguments).verbose);
+    EXPECT_FALSE(parse({"info", "a"}).verbose);
+}
+
 TEST(CommandLineTest, RecordTakesItsLimits) {
     const CommandLine line =
         parse({"record", "--duration", "1.5", "--count", "20", "--force", "drive.pcapng"});

@@ -56,6 +56,33 @@ TEST(DeferredLogTest, DefersTheConsoleTooAndRepeatsNothing) {
     EXPECT_EQ(testing::internal::GetCapturedStderr(), "between gone\n");
 }
 
+TEST(DeferredLogTest, LeavesTheConsoleWhereItWas) {
+    std::FILE* const place = std::tmpfile();
+    ASSERT_NE(place, nullptr);
+    std::FILE* const earlier = redirectConsole(place);
+    testing::internal::CaptureStderr();
+    {
+        DeferredLog held;
+        printLine("a line");
+    }
+    redirectConsole(earlier);
+    EXPECT_EQ(testing::internal::GetCapturedStderr(), "");
+    std::rewind(place);
+    char text[16] = {};
+    EXPECT_EQ(std::fread(text, 1, sizeof text, place), 7U);
+    EXPECT_STREQ(text, "a line\n");
+    std::fclose(place);
+}
+
+TEST(DeferredLogTest, WritesAtOnceAfterItsRelease) {
+    CapturedLog log;
+    DeferredLog held;
+    logLine(LogPriority::Error, "first");
+    held.release();
+    logLine(LogPriority::Error, "second");
+    EXPECT_THAT(log.textsAt(LogPriority::Error), ElementsAre("first", "second"));
+}
+
 TEST(ProgressLineTest, LogLinesTakeItsPlace) {
     CapturedLog log;
     testing::internal::CaptureStderr();

@@ -10,7 +10,10 @@
 #include "Platform/TelephonyService.h"
 #include "PropertyLists/PropertyList.h"
 #include "Recording/DLF/DLFWriter.h"
+#include "Recording/Files/DescriptorFile.h"
+#include "Recording/Pcapng/PcapngReader.h"
 #include "Recording/Pcapng/PcapngWriter.h"
+#include "Recording/Pcapng/RecordingCopy.h"
 #include "Tools/Decode/Decoding.h"
 #include "Tools/Decode/RefreshTicks.h"
 #include "Tools/Messages/TechnologyChoice.h"
@@ -74,7 +77,24 @@ Result<int> ownDescriptor(int descriptor, const std::string& name) {
     return copy;
 }
 
+/// A recording of a recording: what is not known here is kept.
+Result<bool> copyRecording(PcapngReader& reader, const Conversion& conversion, int descriptor) {
+    RecordingCopy copy(reader, std::make_unique<DescriptorFile>(descriptor, false), conversion.name,
+                       std::string(shortTechnologyName(conversion.technology)));
+    Result<Messages> messages = begin(reader, conversion);
+    if (!messages)
+        return Failure{messages.reason()};
+    for (; messages->next; messages->advance())
+        if (const auto added = copy.addMessage(); !added)
+            return Failure{added.reason()};
+    if (const auto finished = copy.finish(); !finished)
+        return Failure{finished.reason()};
+    return true;
+}
+
 Result<bool> toRecording(MessageReader& reader, const Conversion& conversion, int descriptor) {
+    if (auto* recording = dynamic_cast<PcapngReader*>(&reader))
+        return copyRecording(*recording, conversion, descriptor);
     Result<Messages> messages = begin(reader, conversion);
     if (!messages)
         return Failure{messages.reason()};

@@ -10,9 +10,11 @@
 #include "Tools/Decode/DecodeWriter.h"
 #include "Tools/Decode/Jobs/JobScheduler.h"
 #include "Tools/ExitStatus.h"
+#include "Tools/Log/DecoderLog.h"
 #include "Tools/LogOverride.h"
 #include "Tools/Output.h"
 #include "Tools/Report.h"
+#include "Tools/Text/PrintableText.h"
 
 #include <algorithm>
 #include <memory>
@@ -85,7 +87,8 @@ DecodingRequest requestFor(const std::string& path, const DecodeOptions& options
 }
 
 /// Decodes one file and prints it. Returns whether all of it was read.
-bool decodeFile(std::size_t index, const DecodeOptions& options, bool showsProgress, Output& output) {
+bool decodeFile(std::size_t index, const DecodeOptions& options, bool showsProgress, DecoderLines& lines,
+                Output& output) {
     const std::string& path = options.files[index];
     const std::string title = fileTitle(path);
     DecodingRequest request = requestFor(path, options);
@@ -103,10 +106,14 @@ bool decodeFile(std::size_t index, const DecodeOptions& options, bool showsProgr
         if (progress)
             progress->clear();
     };
+    const auto sumUp = [&] { lines.report(options.files.size() > 1 ? printable(title) : std::string()); };
     WorkContext context(title, [&] {
         clearProgress();
         writer->flush();
+        sumUp();
     });
+    // Over the progress line, which only lines that are written replace.
+    const DecoderLog log(lines);
     request.progress = progress ? progress->get() : nullptr;
     const Result<DecodedFile> decoded = decodeMessages(**reader, request, context, *writer);
     clearProgress();
@@ -117,12 +124,13 @@ bool decodeFile(std::size_t index, const DecodeOptions& options, bool showsProgr
         report(title + ": " + decoded.reason());
     const bool allDecoded = decoded && decoded->undecoded.report(title);
     const bool whole = reportLosses(**reader, title);
+    sumUp();
     return allDecoded && whole;
 }
 
 } // namespace
 
-int runDecode(const DecodeOptions& given, Output& output) {
+int runDecode(const DecodeOptions& given, DecoderLines& lines, Output& output) {
     DecodeOptions options = given;
     options.hasTechnologyColumn = needsTechnologyColumn(options);
     if (options.format == DecodeOptions::Format::Csv)
@@ -133,12 +141,12 @@ int runDecode(const DecodeOptions& given, Output& output) {
     bool good = true;
     if (jobs > 1) {
         const Job job = [&](std::size_t index, Output& part) {
-            return decodeFile(index, options, false, part);
+            return decodeFile(index, options, false, lines, part);
         };
         good = JobScheduler(options.files.size(), jobs, job, output).run();
     } else {
         for (std::size_t index = 0; index < options.files.size() && output.isOpen(); ++index)
-            good = decodeFile(index, options, true, output) && good;
+            good = decodeFile(index, options, true, lines, output) && good;
     }
     output.flush();
     return good && output.state() != Output::State::Failed ? ExitStatus::Done : ExitStatus::BadInput;

@@ -7,9 +7,10 @@
 
 namespace velmora {
 
+class DecoderLines;
 class Output;
 
 /// `velmora-log decode`. The exit status. An error in one file does not prevent decoding the others.
-[[nodiscard]] int runDecode(const DecodeOptions& options, Output& output);
+[[nodiscard]] int runDecode(const DecodeOptions& options, DecoderLines& lines, Output& output);
 
 } // namespace velmora

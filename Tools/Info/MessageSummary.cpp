@@ -76,6 +76,37 @@ std::string lossLines(const MessageReader& reader) {
     return text;
 }
 
+std::string placeOf(const Comment& comment) {
+    const std::string number = std::to_string(comment.number);
+    switch (comment.about) {
+    case Comment::About::Snapshot: return "snapshot";
+    case Comment::About::Section: return "section " + number;
+    case Comment::About::Interface: return "interface " + number;
+    case Comment::About::Message: break;
+    }
+    return "record " + number + " at offset " + std::to_string(comment.offset);
+}
+
+/// Nothing for a file without comments.
+std::string commentLines(const Comments& comments) {
+    std::string text;
+    std::uint64_t descriptions = 0;
+    for (const Comment& comment : comments.first())
+        if (comment.about == Comment::About::Snapshot) {
+            text += "described:  " + printable(comment.text) + "\n";
+            ++descriptions;
+        }
+    if (comments.count() == descriptions)
+        return text;
+    text += "comments:   " + std::to_string(comments.count() - descriptions) + "\n";
+    for (const Comment& comment : comments.first())
+        if (comment.about != Comment::About::Snapshot)
+            text += "  " + placeOf(comment) + ": " + printable(comment.text) + "\n";
+    if (comments.count() > comments.first().size())
+        text += "  and " + std::to_string(comments.count() - comments.first().size()) + " more\n";
+    return text;
+}
+
 } // namespace
 
 void MessageSummary::add(const LoggedMessage& message) {
@@ -115,6 +146,7 @@ std::string summaryText(const MessageSummary& summary, const std::string& techno
         text += countLine("wrong type: ", summary.wrongType());
     }
     text += lossLines(reader);
+    text += commentLines(reader.comments());
     if (!summary.codes().empty())
         text += codeTable(summary, names);
     return text;

@@ -30,7 +30,7 @@ int sumUp(const RecordingSession& recording, const std::string& file, int status
 
 } // namespace
 
-int runRecord(const RecordOptions& options) {
+int runRecord(const RecordOptions& options, DecoderLines& lines) {
     const RecordingSession* opened = nullptr;
     const WorkContext context(options.file, [&opened] {
         if (opened)
@@ -45,7 +45,7 @@ int runRecord(const RecordOptions& options) {
     RecordingSession& recording = **session;
     opened = &recording;
     ServiceClient client;
-    int status = Recorder(options, recording, client).run();
+    int status = Recorder(options, recording, lines, client).run();
     if (const Result<Done> closed = recording.close();
         !closed && status == ExitStatus::Done && !recording.hasClosedReader()) {
         report(closed.reason());

@@ -7,7 +7,9 @@
 
 namespace velmora {
 
+class DecoderLines;
+
 /// Returns the exit status.
-[[nodiscard]] int runRecord(const RecordOptions& options);
+[[nodiscard]] int runRecord(const RecordOptions& options, DecoderLines& lines);
 
 } // namespace velmora

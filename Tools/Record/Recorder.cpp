@@ -28,9 +28,10 @@ constexpr auto progressInterval = 1s;
 
 } // namespace
 
-Recorder::Recorder(const RecordOptions& options, RecordingSession& session, ServiceClient& client)
-    : _options(options), _session(session), _client(client),
-      _news(session, options.file, client.clock.now()) {
+Recorder::Recorder(const RecordOptions& options, RecordingSession& session, DecoderLines& lines,
+                   ServiceClient& client)
+    : _options(options), _session(session), _client(client), _news(session, options.file, client.clock.now()),
+      _log(lines, [this](const std::string& problem) { reportProblem(problem); }) {
     RecordingModel::Events events;
     events.message = [this](const Data& message) { take(message); };
     events.technology = [this](std::string_view technology, bool hasDecoder) {
@@ -115,6 +116,12 @@ void Recorder::checkService() {
 void Recorder::serviceIsGone() {
     _gone = true;
     _news.notify(std::string(serviceTitle) + " is gone; waiting for it");
+}
+
+/// At the start. Afterwards a lost service is reported as such, whatever the reason.
+void Recorder::reportProblem(const std::string& problem) {
+    if (!_ended && _session.technology().empty())
+        _news.inform(problem + "; retrying");
 }
 
 /// Ends the recording on a failure, after reporting it. Returns whether there was none.

@@ -3,6 +3,7 @@
 
 #pragma once
 
+#include "Tools/Log/ServiceLog.h"
 #include "Tools/Record/RecordOptions.h"
 #include "Tools/Record/RecordingModel.h"
 #include "Tools/Record/RecordingNews.h"
@@ -10,6 +11,7 @@
 #include "Tools/ServiceClient.h"
 
 #include <memory>
+#include <string>
 #include <string_view>
 
 namespace velmora {
@@ -18,8 +20,9 @@ namespace velmora {
 /// thread only.
 class Recorder {
 public:
-    /// All three must outlive this.
-    Recorder(const RecordOptions& options, RecordingSession& session, ServiceClient& client);
+    /// All four must outlive this.
+    Recorder(const RecordOptions& options, RecordingSession& session, DecoderLines& lines,
+             ServiceClient& client);
 
     /// Runs the client's event loop. Returns the exit status.
     int run();
@@ -31,6 +34,7 @@ private:
     void retry();
     void checkService();
     void serviceIsGone();
+    void reportProblem(const std::string& problem);
     bool check(const Result<Done>& result);
     void showProgress();
     void end(int status);
@@ -39,6 +43,7 @@ private:
     RecordingSession& _session;
     ServiceClient& _client;
     RecordingNews _news;
+    ServiceLog _log; ///< over the progress line of the news, which only lines that are written replace
     std::shared_ptr<RecordingModel> _model;
     bool _streaming = false; ///< the start command has been sent
     bool _gone = false;      ///< the service is gone, and that has been reported

@@ -27,10 +27,14 @@ RecordingNews::RecordingNews(const RecordingSession& session, std::string file, 
         _progress = std::make_unique<ProgressLine>();
 }
 
-void RecordingNews::notify(const std::string& text) {
+void RecordingNews::inform(const std::string& text) {
     if (_progress)
         _progress->clear();
     report(text);
+}
+
+void RecordingNews::notify(const std::string& text) {
+    inform(text);
     logLine(LogPriority::Error, text);
 }
 

@@ -19,6 +19,8 @@ public:
     /// `session` must outlive this; `file` is what messages call the recording.
     RecordingNews(const RecordingSession& session, std::string file, Time started);
 
+    /// A message for the user.
+    void inform(const std::string& text);
     /// A message that the user must get even without looking at the terminal: it goes to the log as well.
     void notify(const std::string& text);
     /// Reports each change once: a temporary error, dropped messages, the end of the error.

@@ -7,6 +7,8 @@
 #include "Platform/Linux/Files/LargeAllocations.h"
 #include "Platform/Linux/SignalWatcher.h"
 #include "Tools/ExitStatus.h"
+#include "Tools/Log/DecoderLog.h"
+#include "Tools/Log/ServiceLog.h"
 #include "Tools/Output.h"
 #include "Tools/Report.h"
 #include "Tools/ServiceClient.h"
@@ -15,6 +17,7 @@
 #include <chrono>
 #include <functional>
 #include <memory>
+#include <optional>
 #include <string>
 #include <string_view>
 #include <utility>
@@ -33,8 +36,15 @@ constexpr const char* connecting = "Connecting...";
 /// stays so; another technology takes another model.
 class WatchModel final : public VelmoraModel {
 public:
-    WatchModel(ModelPlatform platform, ModelObserver* observer, std::function<void()> technologyChanged)
-        : VelmoraModel(std::move(platform), observer), _technologyChanged(std::move(technologyChanged)) {}
+    WatchModel(ModelPlatform platform, ModelObserver* observer, DecoderLines& lines,
+               std::function<void()> technologyChanged)
+        : VelmoraModel(std::move(platform), observer), _lines(lines),
+          _technologyChanged(std::move(technologyChanged)) {}
+
+    void updateWithData(const Data& data) override {
+        const DecoderLog log(_lines);
+        VelmoraModel::updateWithData(data);
+    }
 
 protected:
     [[nodiscard]] std::unique_ptr<LogGenerator>
@@ -42,10 +52,12 @@ protected:
         if (!_technology.empty() && _technology != technology)
             _technologyChanged();
         _technology = technology;
+        const DecoderLog log(_lines);
         return VelmoraModel::generatorFromTechnology(technology);
     }
 
 private:
+    DecoderLines& _lines;
     std::function<void()> _technologyChanged;
     std::string _technology;
 };
@@ -53,12 +65,14 @@ private:
 /// The model's observer: passes each refresh to the view, and keeps the status line up to date in between.
 class Watcher final : public ModelObserver {
 public:
-    Watcher(const WatchOptions& options, Output& output, ServiceClient& client)
-        : _client(client), _once(options.once), _model(newModel()) {
+    Watcher(const WatchOptions& options, DecoderLines& lines, Output& output, ServiceClient& client)
+        : _client(client), _lines(lines), _once(options.once), _model(newModel()) {
         if (!_once && Terminal::isThere())
             _view = std::make_unique<ScreenView>([this] { _client.loop.quit(ExitStatus::Done); });
         else
             _view = std::make_unique<PipeView>(output);
+        // Over the view's own, which holds what is written.
+        _log.emplace(lines);
     }
 
     /// Until the user, a signal or a closed pipe ends it.
@@ -79,7 +93,7 @@ public:
     }
 
     void updateViewControllerFromModel() override {
-        const NodeRef root = _model->topLevelNodes();
+        const NodeRef root = displayNodes();
         if (_model->isConnected())
             _updateMessage = "Updated " + localDateAndTime(_client.clock, _client.clock.now(), " at ");
         _shownStatus = status();
@@ -90,8 +104,13 @@ public:
 
 private:
     [[nodiscard]] std::shared_ptr<VelmoraModel> newModel() {
-        return std::make_shared<WatchModel>(_client.platform(), this,
+        return std::make_shared<WatchModel>(_client.platform(), this, _lines,
                                             [this] { _client.queue.async([this] { beginAnew(); }); });
+    }
+
+    [[nodiscard]] NodeRef displayNodes() {
+        const DecoderLog log(_lines);
+        return _model->topLevelNodes();
     }
 
     void beginAnew() {
@@ -115,9 +134,11 @@ private:
     }
 
     ServiceClient& _client;
+    DecoderLines& _lines;
     bool _once;
     std::shared_ptr<VelmoraModel> _model;
     std::unique_ptr<WatchView> _view;
+    std::optional<ServiceLog> _log;
     std::unique_ptr<Timer> _statusTimer;
     std::string _updateMessage = connecting;
     std::string _shownStatus;
@@ -125,10 +146,10 @@ private:
 
 } // namespace
 
-int runWatch(const WatchOptions& options, Output& output) {
+int runWatch(const WatchOptions& options, DecoderLines& lines, Output& output) {
     returnLargeAllocations();
     ServiceClient client;
-    const int status = Watcher(options, output, client).run();
+    const int status = Watcher(options, lines, output, client).run();
     return output.state() == Output::State::Failed ? ExitStatus::BadInput : status;
 }
 

@@ -7,10 +7,11 @@
 
 namespace velmora {
 
+class DecoderLines;
 class Output;
 
 /// Returns the exit status. Draws on the terminal where standard output is one, prints each refresh to
 /// `output` otherwise.
-[[nodiscard]] int runWatch(const WatchOptions& options, Output& output);
+[[nodiscard]] int runWatch(const WatchOptions& options, DecoderLines& lines, Output& output);
 
 } // namespace velmora

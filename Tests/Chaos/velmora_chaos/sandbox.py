@@ -63,7 +63,7 @@ class Sandbox:
 
     def service(self, source: str, wait: bool = True) -> Program:
         """The telephony service; its standard error is read. With `wait`, returns once it serves."""
-        service = self._start("velmora-telephonyd", "--source", source, reads_errors=True)
+        service = self._start("velmora-telephonyd", "--source", source, "--log-level", "5", reads_errors=True)
         if wait:
             wait_for("the service", lambda: service.lines.count("serving "))
         return service

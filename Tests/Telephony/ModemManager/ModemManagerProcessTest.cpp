@@ -163,7 +163,8 @@ TEST_F(ModemManagerProcessTest, theWantedModemIsFollowed) {
 
 TEST_F(ModemManagerProcessTest, servesWithoutABus) {
     bus.stop();
-    service = start(VELMORA_BUILD_DIR "/velmora-telephonyd", {"--source", "modemmanager"});
+    service =
+        start(VELMORA_BUILD_DIR "/velmora-telephonyd", {"--source", "modemmanager", "--log-level", "4"});
     TestClient client(directory.path(), "com.velmora.test.client");
     ASSERT_TRUE(client.connect());
     EXPECT_EQ(client.technology(), "");

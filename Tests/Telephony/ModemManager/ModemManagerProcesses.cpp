@@ -41,7 +41,7 @@ std::unique_ptr<TestProcess> ModemManagerProcesses::start(const std::string& pro
 }
 
 void ModemManagerProcesses::serve(const std::string& source, const std::string& line) {
-    service = start(VELMORA_BUILD_DIR "/velmora-telephonyd", {"--source", source});
+    service = start(VELMORA_BUILD_DIR "/velmora-telephonyd", {"--source", source, "--log-level", "5"});
     ASSERT_TRUE(eventually([&] { return service->standardError().find(line + '\n') != std::string::npos; }))
         << service->standardError();
 }

@@ -226,30 +226,6 @@ TEST_F(DecodeCommandTest, RecordsThatDecodersDropAreNoBadInput) {
     EXPECT_THAT(process.errors(), HasSubstr("<3>Invalid log type: 2. Dropping.\n"));
 }
 
-TEST_F(DecodeCommandTest, UnreadableSimFilesEndTheStrictProgramWithTheirMessage) {
-    const std::vector<std::uint64_t> offsets = writeRecording(
-        "sim.pcapng", "Ostrel_GSM",
-        {{at(0), rrState(5)}, {at(1), record(0x0000, "DE AD BE EF", 0xFF)}, {at(2), rrState(4)}});
-    writeDrive("drive.pcapng");
-    ToolProcess process(tool({"decode", "--strict", path("drive.pcapng"), path("sim.pcapng")}));
-    EXPECT_EQ(process.exitStatus(), 1);
-    EXPECT_EQ(process.output(), "== " + path("drive.pcapng") + " ==\n" + idleText);
-    EXPECT_EQ(ownMessages(process.errors()), "velmora-log: " + path("sim.pcapng") + ": record 2 at offset " +
-                                                 std::to_string(offsets[1]) +
-                                                 ": SIM File dictionary data could not be constructed\n");
-}
-
-TEST_F(DecodeCommandTest, UnreadableSerializedObjectEndsTheStrictProgramWithItsMessage) {
-    const std::vector<std::uint64_t> offsets =
-        writeRecording("ifx.pcapng", "IFX", {{at(0), hex("00 01 02 03")}});
-    ToolProcess process(tool({"decode", "--strict", path("ifx.pcapng")}));
-    EXPECT_EQ(process.exitStatus(), 1);
-    EXPECT_EQ(process.output(), "");
-    EXPECT_THAT(ownMessages(process.errors()),
-                testing::StartsWith("velmora-log: " + path("ifx.pcapng") + ": record 1 at offset " +
-                                    std::to_string(offsets[0]) + ": "));
-}
-
 TEST_F(DecodeCommandTest, ClosedPipeEndsItQuietly) {
     // More than a pipe holds, so that writing meets the closed end.
     const DictionaryRef display = makeDictionary();
@@ -282,12 +258,39 @@ TEST_F(DecodeCommandTest, ClosedStandardOutputIsReported) {
               "velmora-log: cannot write standard output: Bad file descriptor\n");
 }
 
+TEST_F(DecodeCommandTest, DecoderLinesAreSummedUpUnlessVerbose) {
+    // A type of 2 is dropped with a line.
+    writeRecording("odd.pcapng", "Ostrel_GSM",
+                   {{at(0), record(0x512C, "04 00 01 00", 2)}, {at(1), record(0x512C, "04 00 01 00", 2)}});
+    writeDrive("drive.pcapng");
+    ToolProcess sums(tool({"decode", path("odd.pcapng")}));
+    EXPECT_EQ(sums.exitStatus(), 0);
+    EXPECT_EQ(sums.errors(), "<3>2 times: Invalid log type: 2. Dropping.\n");
+    ToolProcess lines(tool({"decode", "--verbose", path("odd.pcapng")}));
+    EXPECT_EQ(lines.exitStatus(), 0);
+    EXPECT_THAT(lines.errors(),
+                testing::MatchesRegex("<3>Creating Ostrel_GSMLogGenerator object\n"
+                                      "<3>Creating OstrelLogGenerator2 object with 0x[0-9a-f]+\n"
+                                      "<3>Class Index: 1\n"
+                                      "<3>Invalid log type: 2. Dropping.\n"
+                                      "<3>Invalid log type: 2. Dropping.\n"
+                                      "Deallocing Ostrel_GSMClassIndex\n"
+                                      "Deallocing ClassIndex\n"));
+    // With several files each sum names its file, whether or not processes share the work.
+    const std::string both = "<3>" + path("odd.pcapng") + ": 2 times: Invalid log type: 2. Dropping.\n";
+    for (const char* const jobs : {"1", "2"}) {
+        ToolProcess several(tool({"decode", "--jobs", jobs, path("odd.pcapng"), path("drive.pcapng")}));
+        EXPECT_EQ(several.exitStatus(), 0);
+        EXPECT_EQ(several.errors(), both) << jobs;
+    }
+}
+
 TEST_F(DecodeCommandTest, LogLevelDecidesWhichLinesAreWritten) {
     writeDrive("drive.pcapng");
     ToolProcess quiet(tool({"--log-level", "0", "decode", path("drive.pcapng")}));
     EXPECT_EQ(quiet.exitStatus(), 0);
     EXPECT_EQ(quiet.errors().find('<'), std::string::npos) << quiet.errors();
-    ToolProcess loud(tool({"decode", path("drive.pcapng"), "--log-level", "4", "--log", "stderr"}));
+    ToolProcess loud(tool({"decode", path("drive.pcapng"), "-v", "--log-level", "4", "--log", "stderr"}));
     EXPECT_EQ(loud.exitStatus(), 0);
     EXPECT_THAT(loud.errors(), HasSubstr("<4>GSMRRInfo\n"));
     EXPECT_EQ(loud.output(), idleText);

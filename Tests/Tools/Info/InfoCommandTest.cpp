@@ -57,6 +57,20 @@ TEST_F(InfoCommandTest, CountsMessagesByLogCodeWithTheirSections) {
     EXPECT_EQ(ownMessages(process.errors()), "");
 }
 
+TEST_F(InfoCommandTest, ASnapshotsDescriptionIsShown) {
+    writeRecording("drive.pcapng", "Ostrel_GSM", {{at(0), rrState(5)}});
+    ToolProcess made(
+        tool({"convert", "--description", "gate 4,\nroof\x1b", path("drive.pcapng"), path("drive.velmora")}));
+    ASSERT_EQ(made.exitStatus(), 1) << "XML cannot hold an escape character";
+    ToolProcess second(
+        tool({"convert", "--description", "gate 4,\nroof", path("drive.pcapng"), path("drive.velmora")}));
+    ASSERT_EQ(second.exitStatus(), 0);
+    ToolProcess process(tool({"info", path("drive.velmora")}));
+    EXPECT_EQ(process.exitStatus(), 0);
+    EXPECT_THAT(process.output(), testing::HasSubstr("lost:       0\ndescribed:  gate 4,\\nroof\n\n"));
+    EXPECT_THAT(process.output(), testing::Not(testing::HasSubstr("comments:")));
+}
+
 TEST_F(InfoCommandTest, SerializedObjectsHaveNoLogCodes) {
     writeRecording("ifx.pcapng", "IFX", {{at(0), hex("01 02 03")}});
     ToolProcess process(tool({"info", path("ifx.pcapng")}));

@@ -75,6 +75,7 @@ TEST_F(RecordCommandTest, WithoutAServiceNoFileIsLeft) {
     ToolProcess process(tool({"record", "--duration", "0.2", path("drive.pcapng")}));
     EXPECT_EQ(process.exitStatus(), 1);
     EXPECT_EQ(ownMessages(process.errors()),
+              "velmora-log: no telephony service answers; retrying\n"
               "velmora-log: nothing was recorded: the telephony service has named no technology\n");
     EXPECT_FALSE(exists("drive.pcapng"));
 }

@@ -157,6 +157,32 @@ TEST_F(WatchCommandTest, FullDiskIsReported) {
               "velmora-log: cannot write standard output: No space left on device\n");
 }
 
+TEST_F(WatchCommandTest, DecoderLinesAreSummedUpWhenItEnds) {
+    startService("Ostrel_GSM");
+    ToolProcess process(tool({"watch"}));
+    ASSERT_TRUE(isStreaming());
+    for (int i = 0; i < 3; ++i)
+        _service->send(record(0x512C, "04 00 01 00", 2));
+    _service->send(rrState(5));
+    ASSERT_TRUE(process.waitFor("RR_IDLE"));
+    EXPECT_EQ(process.errors(), "");
+    process.signal(SIGINT);
+    EXPECT_EQ(process.exitStatus(), 0);
+    EXPECT_EQ(process.errors(), "<3>3 times: Invalid log type: 2. Dropping.\n");
+}
+
+TEST_F(WatchCommandTest, VerboseWritesDecoderLinesAsTheyArise) {
+    startService("Ostrel_GSM");
+    ToolProcess process(tool({"watch", "-v"}));
+    ASSERT_TRUE(process.waitForError("<3>Creating Ostrel_GSMLogGenerator object\n"));
+    ASSERT_TRUE(isStreaming());
+    _service->send(record(0x512C, "04 00 01 00", 2));
+    ASSERT_TRUE(process.waitForError("<3>Invalid log type: 2. Dropping.\n"));
+    process.signal(SIGINT);
+    EXPECT_EQ(process.exitStatus(), 0);
+    EXPECT_THAT(process.errors(), HasSubstr("Deallocing Ostrel_GSMClassIndex\n"));
+}
+
 TEST_F(WatchCommandTest, SeveralWatchersRunAtOnce) {
     startService();
     ToolProcess one(tool({"watch", "--once"}));
@@ -180,6 +206,23 @@ TEST_F(WatchCommandTest, UnreadableSimFilesEndTheProgramWithTheirMessage) {
     EXPECT_THAT(process.output(), EndsWith(leaveScreen));
     _service.reset();
     EXPECT_THAT(portFiles(), ElementsAre());
+}
+
+TEST_F(WatchCommandTest, OnATerminalTheSumComesAfterTheScreen) {
+    startService("Ostrel_GSM");
+    ToolProcess::Setup setup = onTerminal({"watch"});
+    setup.errorsOnTerminal = true;
+    ToolProcess process(setup);
+    ASSERT_TRUE(isStreaming());
+    for (int i = 0; i < 2; ++i)
+        _service->send(record(0x512C, "04 00 01 00", 2));
+    _service->send(rrState(5));
+    ASSERT_TRUE(process.waitFor("RR_IDLE"));
+    EXPECT_THAT(process.output(), Not(HasSubstr("<3>")));
+    process.type("q");
+    EXPECT_EQ(process.exitStatus(), 0);
+    EXPECT_THAT(process.output(),
+                EndsWith(std::string(leaveScreen) + "<3>2 times: Invalid log type: 2. Dropping.\r\n"));
 }
 
 class WatchTerminalTest : public WatchCommandTest {

@@ -55,7 +55,7 @@ class SandboxTest(unittest.TestCase):
         with Sandbox(self.directory, self.directory) as sandbox:
             service = sandbox.service("scenario:gsm")
             pid, *arguments = sandbox.port("started").read_text().split()
-            self.assertEqual(arguments, ["--source", "scenario:gsm"])
+            self.assertEqual(arguments, ["--source", "scenario:gsm", "--log-level", "5"])
             self.assertEqual(service.lines.count("serving "), 1)
             self.assertTrue(is_running(int(pid)))
         wait_for("the end of the service", lambda: not is_running(int(pid)), 10)

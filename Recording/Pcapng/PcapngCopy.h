@@ -1,0 +1,26 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include "Recording/Pcapng/BlockReader.h"
+
+#include <cstdint>
+#include <string_view>
+#include <vector>
+
+/// Blocks as they are written to another recording. What is not known in them is kept, byte for byte.
+namespace velmora::pcapngCopy {
+
+/// Whether another file may have it: not a custom block that its maker wants to stay in this one.
+[[nodiscard]] bool mayBeCopied(const BlockReader::Block& block);
+
+/// The section header with its section's length left open, since the copy may lack blocks.
+[[nodiscard]] std::vector<std::uint8_t> sectionHeader(const BlockReader::Block& block);
+
+/// The interface description with another name, and all its other options. Precondition: it holds its fields,
+/// and the name has at most 255 bytes.
+[[nodiscard]] std::vector<std::uint8_t> renamedInterface(const BlockReader::Block& block,
+                                                         std::string_view name);
+
+} // namespace velmora::pcapngCopy

@@ -1,0 +1,44 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include "Tools/Log/DecoderLines.h"
+#include "Tools/LogOverride.h"
+
+#include <functional>
+#include <string>
+#include <string_view>
+#include <utility>
+
+namespace velmora {
+
+/// While it lives, the lines about the connection to the telephony service, which repeat with each attempt to
+/// connect, are counted, and a change of what is wrong with it is reported as prose. Other lines are written.
+class ServiceLog final : public LogOverride {
+public:
+    /// `lines` must outlive it. `changed` gets what is wrong now, once for each change: "no telephony service
+    /// answers".
+    explicit ServiceLog(DecoderLines& lines, std::function<void(const std::string& problem)> changed = {})
+        : _lines(lines), _changed(std::move(changed)) {}
+
+    void write(int priority, std::string_view text) override;
+
+    /// What is wrong with the connection, as far as the log has said; empty while nothing is.
+    [[nodiscard]] const std::string& problem() const { return _problem; }
+    /// A reason that has been found otherwise than by the log.
+    void setProblem(const std::string& problem);
+    /// The connection is good now.
+    void clearProblem() {
+        _problem.clear();
+        _attemptFailed = true;
+    }
+
+private:
+    DecoderLines& _lines;
+    std::function<void(const std::string& problem)> _changed;
+    std::string _problem;
+    bool _attemptFailed = true; ///< the next problem is of another attempt to connect
+};
+
+} // namespace velmora
