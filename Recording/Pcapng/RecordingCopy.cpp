@@ -20,8 +20,8 @@ constexpr std::size_t flushThreshold = std::size_t{64} << 10;
 } // namespace
 
 RecordingCopy::RecordingCopy(PcapngReader& reader, std::unique_ptr<OutputFile> file, std::string name,
-                             std::string technology)
-    : _reader(reader), _file(std::move(file)), _name(std::move(name)), _technology(std::move(technology)) {
+                             Names names)
+    : _reader(reader), _file(std::move(file)), _name(std::move(name)), _names(std::move(names)) {
     reader.setOtherBlocks([this](const PcapngReader::Block& block) { addOther(block); });
 }
 
@@ -38,21 +38,25 @@ Result<Done> RecordingCopy::finish() {
 void RecordingCopy::addOther(const PcapngReader::Block& block) {
     if (block.type == pcapng::BlockType::SectionHeader)
         add(pcapngCopy::sectionHeader(block));
-    else if (block.type == pcapng::BlockType::InterfaceDescription && isRenamed(block))
-        add(pcapngCopy::renamedInterface(block, _technology));
+    else if (const std::optional<std::string> name = newName(block))
+        add(pcapngCopy::renamedInterface(block, *name));
     else if (pcapngCopy::mayBeCopied(block))
         add(block.bytes);
 }
 
-/// Whether the block describes an interface of the messages that are named anew.
-bool RecordingCopy::isRenamed(const PcapngReader::Block& block) const {
-    if (_technology.empty())
-        return false;
+std::optional<std::string> RecordingCopy::newName(const PcapngReader::Block& block) const {
+    if (block.type != pcapng::BlockType::InterfaceDescription)
+        return std::nullopt;
     const auto interface = InterfaceDescription::read(block.body(), block.bigEndian);
     if (!interface || interface->linkType != pcapng::logMessageLinkType)
-        return false;
+        return std::nullopt;
     const std::string_view name = shortTechnologyName(interface->name);
-    return name != _technology && (name.empty() || name == _reader.technology());
+    if (!_names.only.empty() && name != _names.only && !name.empty())
+        return std::string();
+    const bool isFirst = name.empty() || name == _reader.technology();
+    if (!_names.technology.empty() && name != _names.technology && isFirst)
+        return _names.technology;
+    return std::nullopt;
 }
 
 void RecordingCopy::add(Bytes bytes) {
