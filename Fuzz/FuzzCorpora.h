@@ -23,6 +23,7 @@ namespace velmora {
 [[nodiscard]] FuzzCorpus recordingCorpus();
 [[nodiscard]] FuzzCorpus dlfCorpus();
 [[nodiscard]] FuzzCorpus snapshotCorpus();
+[[nodiscard]] FuzzCorpus gzipCorpus();
 [[nodiscard]] FuzzCorpus sourceStringCorpus();
 
 } // namespace velmora

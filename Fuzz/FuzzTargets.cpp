@@ -22,6 +22,7 @@ constexpr FuzzTargetKind kinds[] = {
     {"recording", makeRecordingTarget, recordingCorpus, 1536},
     {"dlf", makeDLFTarget, dlfCorpus},
     {"snapshot", makeSnapshotTarget, snapshotCorpus, 6144},
+    {"gzip", makeGzipTarget, gzipCorpus, 512},
     {"source-string", makeSourceStringTarget, sourceStringCorpus, 128},
 };
 

@@ -44,6 +44,7 @@ struct FuzzTargetKind {
 [[nodiscard]] std::unique_ptr<FuzzTarget> makeRecordingTarget();
 [[nodiscard]] std::unique_ptr<FuzzTarget> makeDLFTarget();
 [[nodiscard]] std::unique_ptr<FuzzTarget> makeSnapshotTarget();
+[[nodiscard]] std::unique_ptr<FuzzTarget> makeGzipTarget();
 [[nodiscard]] std::unique_ptr<FuzzTarget> makeSourceStringTarget();
 
 } // namespace velmora

@@ -71,6 +71,9 @@ public:
     virtual void setReadsAllTechnologies(bool) {}
     /// The file's form, for messages: "recording", "snapshot", "DLF log".
     [[nodiscard]] virtual std::string_view form() const { return "recording"; }
+    /// Whether the file is gzip'd; offsets are those in what it unpacks to.
+    [[nodiscard]] bool isCompressed() const { return _isCompressed; }
+    void setCompressed() { _isCompressed = true; }
     /// The read error that ended the stream early; absent when it ended with the file.
     [[nodiscard]] virtual const std::optional<Failure>& failure() const = 0;
 
@@ -92,6 +95,7 @@ private:
     std::vector<Loss> _losses;
     LossTotals _lossTotals;
     Comments _comments;
+    bool _isCompressed = false;
 };
 
 } // namespace velmora

@@ -5,6 +5,7 @@
 
 #include "Recording/DLF/DLFReader.h"
 #include "Recording/Files/FileSource.h"
+#include "Recording/Files/GzipSource.h"
 #include "Recording/Pcapng/PcapngReader.h"
 #include "Recording/Snapshots/SnapshotReader.h"
 
@@ -38,11 +39,36 @@ bool isPropertyList(Bytes begin) {
     return false;
 }
 
+/// A capture file of the older format, in either byte order, with microseconds or nanoseconds.
+bool isClassicCapture(Bytes begin) {
+    for (const std::string_view magic :
+         {"\xA1\xB2\xC3\xD4", "\xD4\xC3\xB2\xA1", "\xA1\xB2\x3C\x4D", "\x4D\x3C\xB2\xA1"})
+        if (startsWith(begin, magic))
+            return true;
+    return false;
+}
+
 template <class Reader>
 Result<std::unique_ptr<MessageReader>> generalized(Result<std::unique_ptr<Reader>> reader) {
     if (!reader)
         return Failure{reader.reason()};
     return std::unique_ptr<MessageReader>(*std::move(reader));
+}
+
+Result<std::unique_ptr<MessageReader>> openUnpacked(ChunkedInput input) {
+    // Reads no more than the decision needs: on a pipe more may take a while to arrive.
+    constexpr std::string_view sectionHeader = "\n\r\r\n";
+    static_cast<void>(input.ensure(sectionHeader.size()));
+    if (startsWith(input.available(), sectionHeader))
+        return generalized(PcapngReader::open(std::move(input)));
+    if (isClassicCapture(input.available()))
+        return Failure{
+            "classic pcap file, wanted pcapng; this converts it: editcap -F pcapng IN.pcap OUT.pcapng"};
+    constexpr std::size_t longestWhiteSpace = 256;
+    static_cast<void>(input.ensure(longestWhiteSpace));
+    if (isPropertyList(input.available()))
+        return generalized(SnapshotReader::open(std::move(input)));
+    return generalized(DLFReader::open(std::move(input), "a recording, a snapshot or a DLF log"));
 }
 
 } // namespace
@@ -58,8 +84,8 @@ std::vector<std::string> technologiesOf(const std::string& path) {
     std::error_code error;
     if (path == "-" || !std::filesystem::is_regular_file(path, error))
         return {};
-    const Result<std::unique_ptr<PcapngReader>> reader = PcapngReader::open(path);
-    if (!reader)
+    const Result<std::unique_ptr<MessageReader>> reader = openMessages(path);
+    if (!reader || !dynamic_cast<PcapngReader*>(reader->get()))
         return {};
     while ((*reader)->next()) {
     }
@@ -67,16 +93,15 @@ std::vector<std::string> technologiesOf(const std::string& path) {
 }
 
 Result<std::unique_ptr<MessageReader>> openMessages(ChunkedInput input) {
-    // Reads no more than the decision needs: on a pipe more may take a while to arrive.
-    constexpr std::string_view sectionHeader = "\n\r\r\n";
-    static_cast<void>(input.ensure(sectionHeader.size()));
-    if (startsWith(input.available(), sectionHeader))
-        return generalized(PcapngReader::open(std::move(input)));
-    constexpr std::size_t longestWhiteSpace = 256;
-    static_cast<void>(input.ensure(longestWhiteSpace));
-    if (isPropertyList(input.available()))
-        return generalized(SnapshotReader::open(std::move(input)));
-    return generalized(DLFReader::open(std::move(input), "a recording, a snapshot or a DLF log"));
+    constexpr std::size_t gzipStart = 4;
+    static_cast<void>(input.ensure(gzipStart));
+    if (!isGzip(input.available()))
+        return openUnpacked(std::move(input));
+    Result<std::unique_ptr<MessageReader>> reader =
+        openUnpacked(ChunkedInput(std::make_unique<GzipSource>(std::move(input))));
+    if (reader)
+        (*reader)->setCompressed();
+    return reader;
 }
 
 } // namespace velmora

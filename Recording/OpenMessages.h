@@ -14,7 +14,8 @@
 namespace velmora {
 
 /// Opens a file of log messages - a recording, a snapshot, a DLF log - recognising its form by its first
-/// bytes, never by its name. "-" is standard input. The reason does not repeat the path.
+/// bytes, never by its name. A gzip'd one is unpacked as it is read. "-" is standard input. The reason does
+/// not repeat the path.
 Result<std::unique_ptr<MessageReader>> openMessages(const std::string& path);
 /// As above, for an input of which nothing has been skipped.
 Result<std::unique_ptr<MessageReader>> openMessages(ChunkedInput input);

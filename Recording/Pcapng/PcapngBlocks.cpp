@@ -60,7 +60,7 @@ constexpr std::size_t capturedOffset = 20;
 
 } // namespace
 
-void appendHead(Buffer& buffer, std::string_view technology) {
+void appendSection(Buffer& buffer) {
     const auto sectionLength =
         static_cast<std::uint32_t>(24 + optionSize(application.size()) + optionSize(0) + 4);
     put32(buffer, BlockType::SectionHeader);
@@ -73,7 +73,9 @@ void appendHead(Buffer& buffer, std::string_view technology) {
     putOption(buffer, Option::SectionUserApplication, application);
     putOption(buffer, Option::End, std::string_view());
     put32(buffer, sectionLength);
+}
 
+void appendInterface(Buffer& buffer, std::string_view technology) {
     const auto interfaceLength =
         static_cast<std::uint32_t>(16 + optionSize(technology.size()) + optionSize(1) + optionSize(0) + 4);
     put32(buffer, BlockType::InterfaceDescription);

@@ -15,8 +15,11 @@
 /// type 147, nanoseconds, the technology as its name), then one Enhanced Packet Block a message.
 namespace velmora::pcapngBlocks {
 
-/// Adds the section header and the interface description. Precondition: `technology` has at most 65535 bytes.
-void appendHead(std::vector<std::uint8_t>& buffer, std::string_view technology);
+/// Adds the section header.
+void appendSection(std::vector<std::uint8_t>& buffer);
+
+/// Adds the interface description. Precondition: `technology` has at most 65535 bytes.
+void appendInterface(std::vector<std::uint8_t>& buffer, std::string_view technology);
 
 /// Adds a message's block. A time before 1970 cannot be written and becomes 1970-01-01. Precondition: the
 /// message is not above `maximumMessageSize`.

@@ -51,7 +51,8 @@ Result<std::unique_ptr<PcapngWriter>> PcapngWriter::start(std::unique_ptr<Output
     if (shortName.size() > maximumTechnology)
         return Failure{"technology name of " + std::to_string(shortName.size()) + " bytes, wanted at most " +
                        std::to_string(maximumTechnology)};
-    pcapngBlocks::appendHead(writer->_buffer, shortName);
+    pcapngBlocks::appendSection(writer->_buffer);
+    pcapngBlocks::appendInterface(writer->_buffer, shortName);
     if (const Result<Done> written = writer->flush(); !written && !writer->hasTemporaryError())
         return Failure{written.reason()};
     return writer;

@@ -6,6 +6,7 @@
 #include "Platform/TelephonyService.h"
 #include "Recording/Pcapng/InterfaceDescription.h"
 #include "Recording/Pcapng/Pcapng.h"
+#include "Recording/Pcapng/PcapngBlocks.h"
 #include "Recording/Pcapng/PcapngCopy.h"
 
 #include <system_error>
@@ -31,26 +32,37 @@ Result<Done> RecordingCopy::addMessage() {
 }
 
 Result<Done> RecordingCopy::finish() {
+    add({});
+    if (!_hasInterface && !_names.technology.empty())
+        pcapngBlocks::appendInterface(_buffer, _names.technology);
     flush();
     return _failure ? Result<Done>(*_failure) : Done{};
 }
 
 void RecordingCopy::addOther(const PcapngReader::Block& block) {
-    if (block.type == pcapng::BlockType::SectionHeader)
+    if (block.type == pcapng::BlockType::SectionHeader) {
+        _hasSection = true;
         add(pcapngCopy::sectionHeader(block));
-    else if (const std::optional<std::string> name = newName(block))
+    } else if (block.type == pcapng::BlockType::InterfaceDescription) {
+        addInterface(block);
+    } else if (pcapngCopy::mayBeCopied(block)) {
+        add(block.bytes);
+    }
+}
+
+void RecordingCopy::addInterface(const PcapngReader::Block& block) {
+    const auto interface = InterfaceDescription::read(block.body(), block.bigEndian);
+    const bool isOfMessages = interface && interface->linkType == pcapng::logMessageLinkType;
+    _hasInterface = _hasInterface || isOfMessages;
+    const std::optional<std::string> name =
+        isOfMessages ? newName(shortTechnologyName(interface->name)) : std::nullopt;
+    if (name)
         add(pcapngCopy::renamedInterface(block, *name));
-    else if (pcapngCopy::mayBeCopied(block))
+    else
         add(block.bytes);
 }
 
-std::optional<std::string> RecordingCopy::newName(const PcapngReader::Block& block) const {
-    if (block.type != pcapng::BlockType::InterfaceDescription)
-        return std::nullopt;
-    const auto interface = InterfaceDescription::read(block.body(), block.bigEndian);
-    if (!interface || interface->linkType != pcapng::logMessageLinkType)
-        return std::nullopt;
-    const std::string_view name = shortTechnologyName(interface->name);
+std::optional<std::string> RecordingCopy::newName(std::string_view name) const {
     if (!_names.only.empty() && name != _names.only && !name.empty())
         return std::string();
     const bool isFirst = name.empty() || name == _reader.technology();
@@ -60,6 +72,9 @@ std::optional<std::string> RecordingCopy::newName(const PcapngReader::Block& blo
 }
 
 void RecordingCopy::add(Bytes bytes) {
+    // Where the recording's own is damaged, what follows is little-endian to its reader.
+    if (!std::exchange(_hasSection, true))
+        pcapngBlocks::appendSection(_buffer);
     _buffer.insert(_buffer.end(), bytes.begin(), bytes.end());
     if (_buffer.size() >= flushThreshold)
         flush();

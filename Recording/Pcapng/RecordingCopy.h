@@ -11,6 +11,7 @@
 #include <memory>
 #include <optional>
 #include <string>
+#include <string_view>
 #include <vector>
 
 namespace velmora {
@@ -34,21 +35,24 @@ public:
 
     /// Adds the message that the reader last returned.
     Result<Done> addMessage();
-    /// Writes what is left.
+    /// Writes what is left, and the interface of the technology where the recording has none of messages.
     Result<Done> finish();
 
 private:
     void addOther(const PcapngReader::Block& block);
+    void addInterface(const PcapngReader::Block& block);
     void add(Bytes bytes);
     void flush();
-    /// The name of a described interface in the copy; absent where it keeps its own.
-    [[nodiscard]] std::optional<std::string> newName(const PcapngReader::Block& block) const;
+    /// The name in the copy of an interface of messages; absent where it keeps its own.
+    [[nodiscard]] std::optional<std::string> newName(std::string_view name) const;
 
     PcapngReader& _reader;
     std::unique_ptr<OutputFile> _file;
     std::string _name;
     Names _names;
     std::vector<std::uint8_t> _buffer;
+    bool _hasSection = false;   ///< a section header has been added
+    bool _hasInterface = false; ///< an interface of messages has been added
     std::optional<Failure> _failure;
 };
 

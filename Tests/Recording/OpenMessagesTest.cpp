@@ -182,9 +182,9 @@ TEST_F(OpenMessages, saysWhatIsWrongWithOtherFiles) {
     EXPECT_EQ(reasonFor(fileOf(Data())), "empty, wanted a recording, a snapshot or a DLF log");
     EXPECT_EQ(reasonFor(fileOf(hex("0A0D0D0A 1C0000"))),
               "begins 0A 0D 0D 0A 1C 00 00 (hex), wanted a pcapng section header");
-    EXPECT_EQ(
-        reasonFor(fileOf(hex("D4C3B2A1 02000400 00000000 00000000"))),
-        "begins D4 C3 B2 A1 02 00 04 00 00 00 00 00 (hex), wanted a recording, a snapshot or a DLF log");
+    for (const char* const magic : {"D4C3B2A1", "A1B2C3D4", "4D3CB2A1", "A1B23C4D"})
+        EXPECT_EQ(reasonFor(fileOf(joined(hex(magic), hex("02000400 00000000 00000000")))),
+                  "classic pcap file, wanted pcapng; this converts it: editcap -F pcapng IN.pcap OUT.pcapng");
     EXPECT_EQ(reasonFor(fileOf(hex("0A0D0D0A 1C000000 4D3C2B1B 01000000"))),
               "begins 0A 0D 0D 0A 1C 00 00 00 4D 3C 2B 1B (hex), wanted a pcapng section header");
 }

@@ -33,8 +33,11 @@ bool writesAsItGoes(const DecodeOptions& options) {
 /// The progress of one file on standard error, if that is a terminal and the file is long enough.
 class ShownProgress {
 public:
-    ShownProgress(const std::string& path, const DecodeOptions& options) {
+    ShownProgress(const MessageReader& reader, const std::string& path, const DecodeOptions& options) {
         if (::isatty(STDERR_FILENO) == 0)
+            return;
+        // Of a gzip'd file the offsets are no shares of its size.
+        if (reader.isCompressed())
             return;
         // On the same terminal it would mix with the lines.
         if (writesAsItGoes(options) && ::isatty(STDOUT_FILENO) != 0)
@@ -101,7 +104,7 @@ bool decodeFile(std::size_t index, const DecodeOptions& options, bool showsProgr
     const std::unique_ptr<DecodeWriter> writer = DecodeWriter::make(options, index, isLive, output);
     std::optional<ShownProgress> progress;
     if (showsProgress)
-        progress.emplace(path, options);
+        progress.emplace(**reader, path, options);
     const auto clearProgress = [&progress] {
         if (progress)
             progress->clear();

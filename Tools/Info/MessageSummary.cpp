@@ -131,7 +131,8 @@ void MessageSummary::add(const LoggedMessage& message) {
 
 std::string summaryText(const MessageSummary& summary, const std::string& technology, const CodeNames& names,
                         const MessageReader& reader) {
-    std::string text = "form:       " + std::string(reader.form()) + "\n";
+    std::string text =
+        "form:       " + std::string(reader.form()) + (reader.isCompressed() ? ", gzip'd\n" : "\n");
     text += "technology: " + (technology.empty() ? "not named" : printable(technology)) + "\n";
     if (summary.first()) {
         text += "first:      " + timeText(*summary.first()) + "\n";

@@ -118,6 +118,23 @@ TEST_F(RecordingCopyTest, LostMessagesAndDamagedBlocksAreLeftOut) {
     expectOutput(joined(head, hex(message)));
 }
 
+TEST_F(RecordingCopyTest, ADamagedHeadIsMadeAgain) {
+    // A recording without a message has the head that we write.
+    writeRecording("empty.pcapng", "Ostrel_GSM", {});
+    const std::string head = contentOf("empty.pcapng");
+    const Data written(std::vector<std::uint8_t>(head.begin(), head.end()));
+    // The interface that we write: 8 + 8 bytes, name 4 + 12, resolution 4 + 4, end 4, length 4.
+    const std::size_t interface = written.size() - 48;
+    put("in.pcapng", joined(hex("0A0D0D0A 1C000000 4D3C2B1A 0100 0000 FFFFFFFFFFFFFFFF 1D000000"),
+                            hex(messageInterface), hex(message)));
+    EXPECT_THAT(convert(1), HasSubstr("trailing block length 29, wanted 28\n"));
+    expectOutput(joined(Data::copyOf(written.bytes().first(interface)), hex(messageInterface), hex(message)));
+    put("in.pcapng", hex("0A0D0D0A 1C000000 4D3C2B1A 0100 0000 FFFFFFFFFFFFFFFF 1D000000"));
+    EXPECT_THAT(convert(1, {"--technology", "Ostrel_GSM"}),
+                HasSubstr("trailing block length 29, wanted 28\n"));
+    expectOutput(written);
+}
+
 TEST_F(RecordingCopyTest, SectionsKeepTheirByteOrder) {
     const Data file = joined(hex(sectionWithoutLength), hex(messageInterface), hex(message), hex(R"(
         0A0D0D0A 0000001C 1A2B3C4D 0001 0002 FFFFFFFFFFFFFFFF 0000001C

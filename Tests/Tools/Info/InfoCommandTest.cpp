@@ -1,6 +1,7 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
+#include "Tests/Support/ShellCommand.h"
 #include "Tests/Tools/ToolFixture.h"
 
 #include <gmock/gmock.h>
@@ -69,6 +70,26 @@ TEST_F(InfoCommandTest, ASnapshotsDescriptionIsShown) {
     EXPECT_EQ(process.exitStatus(), 0);
     EXPECT_THAT(process.output(), testing::HasSubstr("lost:       0\ndescribed:  gate 4,\\nroof\n\n"));
     EXPECT_THAT(process.output(), testing::Not(testing::HasSubstr("comments:")));
+}
+
+TEST_F(InfoCommandTest, GzippedFilesAreListedAsWhatTheyUnpackTo) {
+    NEEDS_PROGRAM("gzip");
+    writeRecording("drive.pcapng", "Ostrel_GSM", {{at(0), rrState(5)}, {at(1), hex("01 02 03")}});
+    ASSERT_EQ(runShell("gzip -k " + path("drive.pcapng")).status, 0);
+    ToolProcess plain(tool({"info", path("drive.pcapng")}));
+    ToolProcess process(tool({"info", path("drive.pcapng.gz")}));
+    EXPECT_EQ(plain.exitStatus(), 0);
+    EXPECT_EQ(process.exitStatus(), 0);
+    const std::string form = "form:       recording";
+    ASSERT_THAT(plain.output(), testing::StartsWith(form + "\n"));
+    EXPECT_EQ(process.output(), form + ", gzip'd" + plain.output().substr(form.size()));
+    // What is cut is named, and what comes before is listed.
+    ASSERT_EQ(runShell("head -c -3 " + path("drive.pcapng.gz") + " > " + path("cut.gz")).status, 0);
+    ToolProcess cut(tool({"info", path("cut.gz")}));
+    EXPECT_EQ(cut.exitStatus(), 1);
+    EXPECT_EQ(cut.output(), process.output());
+    EXPECT_THAT(cut.errors(), testing::StartsWith("velmora-log: " + path("cut.gz") +
+                                                  ": gzip'd data that ends early, at byte "));
 }
 
 TEST_F(InfoCommandTest, SerializedObjectsHaveNoLogCodes) {
