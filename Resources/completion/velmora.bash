@@ -97,7 +97,11 @@ _velmora_log() {
     done
     case $prev in
     --format)
-        _velmora_offer text json jsonl csv
+        if [[ $command == info ]]; then
+            _velmora_offer text json
+        else
+            _velmora_offer text json jsonl csv
+        fi
         return
         ;;
     --every)
@@ -128,7 +132,7 @@ _velmora_log() {
     watch) options+=(--once) ;;
     record) options+=(--force --duration --count) ;;
     convert) options+=(--force --from --to --code --technology --description --strict) ;;
-    info) options+=(--technology) ;;
+    info) options+=(--format --technology) ;;
     esac
     if [[ $cur == -* ]]; then
         _velmora_offer "${options[@]}"
@@ -136,7 +140,7 @@ _velmora_log() {
     fi
     # As many files as the command takes.
     case $command:$files in
-    decode:* | record:0 | convert:[01] | info:0) _filedir '@(pcapng|velmora|dlf)' ;;
+    decode:* | info:* | record:0 | convert:[01]) _filedir '@(pcapng|velmora|dlf)' ;;
     esac
 }
 

@@ -127,12 +127,17 @@ TEST(CommandLineTest, ConvertTakesWhatTheNewFileIsToBe) {
     EXPECT_EQ(plain->description, "");
 }
 
-TEST(CommandLineTest, InfoTakesAFileAndATechnology) {
-    const CommandLine line = parse({"info", "a.dlf", "--technology", "Ostrel_LTE"});
+TEST(CommandLineTest, InfoTakesFilesFormatAndTechnology) {
+    const CommandLine line = parse({"info", "a.dlf", "--technology", "Ostrel_LTE", "--format", "json", "-"});
     const auto* info = std::get_if<InfoOptions>(&line.command);
     ASSERT_NE(info, nullptr);
-    EXPECT_EQ(info->file, "a.dlf");
+    EXPECT_THAT(info->files, ElementsAre("a.dlf", "-"));
     EXPECT_EQ(info->technology, "Ostrel_LTE");
+    EXPECT_EQ(info->format, InfoOptions::Format::Json);
+    const CommandLine plainLine = parse({"info", "a.dlf"});
+    const auto* plain = std::get_if<InfoOptions>(&plainLine.command);
+    ASSERT_NE(plain, nullptr);
+    EXPECT_EQ(plain->format, InfoOptions::Format::Text);
 }
 
 TEST(CommandLineTest, UsageErrorsGiveTheFoundAndTheExpectedValue) {
@@ -172,7 +177,8 @@ TEST(CommandLineTest, UsageErrorsGiveTheFoundAndTheExpectedValue) {
         {{"record", "a", "--duration", "1e99"}, "--duration: got 1e99, wanted seconds from 0.001 to 2000000"},
         {{"convert", "a"}, "OUT is required"},
         {{"convert", "a", "-"}, "OUT: got -, wanted a name that ends in .pcapng, .velmora or .dlf"},
-        {{"info", "a", "b"}, "The following argument was not expected: b"},
+        {{"info"}, "FILE is required"},
+        {{"info", "--format", "jsonl", "a"}, "--format: got jsonl, wanted text or json"},
         {{"watch", "--log-level", "8"}, "--log-level: got 8, wanted a number from 0 to 7"},
         {{"--log", "file", "watch"}, "--log: got file, wanted syslog or stderr"},
     };
