@@ -20,7 +20,7 @@
 #include <unistd.h>
 
 // What `velmora-log decode` costs a message beyond decoding it: the text of a section and of a time, and
-// whole drives in their formats, written to nowhere. Bytes are those of the text, items are messages.
+// complete drives in their formats, written to nowhere. Bytes are those of the text, items are messages.
 
 namespace velmora {
 namespace {

@@ -11,7 +11,7 @@ namespace velmora {
 
 namespace {
 
-/// What a reader gave for a stream.
+/// What a reader returned for a stream.
 struct Taken {
     std::vector<std::uint8_t> frames; ///< encoded again, one after another
     std::string failure;

@@ -17,7 +17,7 @@ namespace velmora {
 ///     0  a record of the baseband's stream: u16 log code, u16 payload length, payload
 ///     1  one of the telephony service's extra stream, likewise
 ///     2  as 0, after the prefix 81 00
-///     3  a message as it stands: u16 length, bytes
+///     3  a message as it is: u16 length, bytes
 ///     4  a redraw
 ///     5  a reconnection: another decoder goes on with the same state
 ///

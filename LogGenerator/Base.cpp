@@ -4,6 +4,8 @@
 #include "LogGenerator/Base.h"
 
 #include "LogGenerator/ArrayLock.h"
+#include "LogGenerator/Observations/ContentVisitor.h"
+#include "LogGenerator/Observations/Observer.h"
 #include "Platform/SystemLog.h"
 
 #include <algorithm>
@@ -48,7 +50,8 @@ void Base::updateLogCodeDict(CodeDictionary& codeDict) {
 }
 
 void Base::updateWithData(const Data& data, std::uint32_t logCode) {
-    trace();
+    if (isLogged(LogPriority::Warning)) // saves most records a virtual call
+        trace();
     const View* const view = viewOf(logCode);
     if (!view) {
         unknownCode(logCode);
@@ -58,12 +61,19 @@ void Base::updateWithData(const Data& data, std::uint32_t logCode) {
     if (record.size() < view->minimumLength)
         return;
     check(*view, record);
-    keep(*view, record.part(0, neededLength(*view, record)), partsOf(*view, record));
+    keep(*view, record.part(0, std::min(view->readLength, record.size())), partsOf(*view, record));
 }
 
 void Base::decode(const View& view, const Record& record, FieldVisitor& visitor) const {
     if (view.table)
         visitor.fields(record, *view.table);
+}
+
+void Base::describe(const View& view, ContentVisitor& visitor) const {
+    if (view.table)
+        visitor.fields(view.table->fields);
+    else
+        visitor.contents(view.contents);
 }
 
 void Base::trace() const {
@@ -76,19 +86,8 @@ void Base::unknownCode(std::uint32_t logCode) const {
 
 void Base::check(const View&, const Record&) const {}
 
-std::size_t Base::neededLength(const View& view, const Record& record) const {
-    return view.table ? view.minimumLength : record.size();
-}
-
 KeptRecords::Parts Base::partsOf(const View&, const Record&) const {
     return 1;
-}
-
-const View* Base::viewOf(std::uint32_t logCode) const {
-    const std::span<const View> all = _views.empty() ? views() : _views;
-    const auto found =
-        std::find_if(all.begin(), all.end(), [logCode](const View& view) { return view.code == logCode; });
-    return found == all.end() ? nullptr : &*found;
 }
 
 bool Base::prepareFor(const View& view, KeptRecords::Parts parts) {
@@ -104,6 +103,13 @@ bool Base::prepareFor(const View& view, KeptRecords::Parts parts) {
 void Base::keepPrepared(const View& view, const Record& record, KeptRecords::Parts parts) {
     if (_records.keep(indexOf(view), record.bytes(), parts))
         writeNode();
+    if (_observer)
+        observeRecord(view, record);
+}
+
+void Base::observeRecord(const View& view, const Record& record) {
+    if (_observer->beginSection(*_fieldMap, view.code))
+        decode(view, record, *_observer);
 }
 
 void Base::writeNode() {

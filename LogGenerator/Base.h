@@ -21,6 +21,9 @@
 namespace velmora {
 
 class Base;
+class ContentVisitor;
+class FieldMap;
+class Observer;
 
 /// Section name to section. The class index owns the sections.
 using ClassDictionary = std::map<std::string, Base*, std::less<>>;
@@ -60,6 +63,16 @@ public:
     /// table.
     virtual void decode(const View& view, const Record& record, FieldVisitor& visitor) const;
 
+    /// Describes everything that `decode` may name of records of the view. The default describes the view's
+    /// table or contents.
+    virtual void describe(const View& view, ContentVisitor& visitor) const;
+    /// From now on the observer gets what `decode` names of each accepted record, by the section's map. Null:
+    /// nothing is observed. Both must outlive the section or the next call.
+    void observe(Observer* observer, const FieldMap* map) {
+        _observer = observer;
+        _fieldMap = map;
+    }
+
     /// Sets the section's node, a dictionary or an array.
     void updateSectionRef(const Value& node);
     /// The node with all that has arrived; none before the display is built and once it is gone.
@@ -82,22 +95,19 @@ public:
 protected:
     Base() = default;
 
-    /// The log line of each record, decoded or not: the section's name at warning priority.
+    /// The log line of each record, decoded or not: the section's name at warning priority. It must not be
+    /// more urgent than that: where warnings are not logged, it is not called.
     virtual void trace() const;
     /// A record under a code that no view has: an error line.
     virtual void unknownCode(std::uint32_t logCode) const;
     /// Logs what an accepted record lacks, once, on arrival. The default logs nothing.
     virtual void check(const View& view, const Record& record) const;
-    /// How much of an accepted record `decode` reads; the rest is not kept. The default is what the
-    /// view's table reads, or all of it.
-    [[nodiscard]] virtual std::size_t neededLength(const View& view, const Record& record) const;
     /// The parts that `decode` names of this record, where records of the view differ in their labels (see
     /// KeptRecords). The default is that they do not.
     [[nodiscard]] virtual KeptRecords::Parts partsOf(const View& view, const Record& record) const;
 
-    /// Keeps what `decode` needs of a record, to be written into the node. Without a node it is dropped.
-    /// `store`, called before, may keep more than bytes in the section: what it replaces has been written
-    /// by then where it must be.
+    /// Keeps a record to be written into the node. Without a node it is dropped. `store`, called before, may
+    /// keep more than bytes in the section: what it replaces has been written by then where it must be.
     template <class Store>
     void keep(const View& view, const Record& record, KeptRecords::Parts parts, Store store) {
         if (prepareFor(view, parts)) {
@@ -110,9 +120,14 @@ protected:
     }
 
     /// The view of that code, or null.
-    [[nodiscard]] const View* viewOf(std::uint32_t logCode) const;
+    [[nodiscard]] const View* viewOf(std::uint32_t logCode) const {
+        for (const View& view : _views.empty() ? views() : _views)
+            if (view.code == logCode)
+                return &view;
+        return nullptr;
+    }
 
-    /// "Record 0x5137: 2 of 3 entries", where the record holds fewer than its count announces.
+    /// "Record 0x5137: 2 of 3 entries", where the record holds fewer than its count.
     static void reportMissingEntries(const CountedList& list, std::uint32_t logCode);
     /// The same for a list whose entries' lengths differ: `complete` of `count` lie inside the record.
     static void reportMissingEntries(std::size_t complete, std::size_t count, std::uint32_t logCode);
@@ -127,6 +142,7 @@ private:
     /// Writes what the record would replace and has more to show. Whether there is a node to keep it for.
     [[nodiscard]] bool prepareFor(const View& view, KeptRecords::Parts parts);
     void keepPrepared(const View& view, const Record& record, KeptRecords::Parts parts);
+    void observeRecord(const View& view, const Record& record);
     void writeInto(Array& node);
 
     /// A node that the display owns. On the one thread there is, it cannot be destroyed while a record is
@@ -152,6 +168,8 @@ private:
     std::span<const View> _views; ///< as `views` returns them, since there has been a node
     KeptRecords _records;
     DisplayWriter::SpareRows _spareRows;
+    Observer* _observer = nullptr;
+    const FieldMap* _fieldMap = nullptr;
 };
 
 } // namespace velmora

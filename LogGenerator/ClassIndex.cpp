@@ -66,9 +66,9 @@ void ClassIndex::releaseSections() {
 }
 
 void ClassIndex::status() const {
-    using Content = std::remove_const_t<decltype(classDict)>;
-    logFormat(LogPriority::Warning, "Dictionary = %d", std::is_same_v<Content, ClassDictionary> ? 1 : 0);
-    logFormat(LogPriority::Warning, "String = %d", std::is_same_v<Content, std::string> ? 1 : 0);
+    using Index = std::remove_const_t<decltype(classDict)>;
+    logFormat(LogPriority::Warning, "Dictionary = %d", std::is_same_v<Index, ClassDictionary> ? 1 : 0);
+    logFormat(LogPriority::Warning, "String = %d", std::is_same_v<Index, std::string> ? 1 : 0);
 }
 
 } // namespace velmora

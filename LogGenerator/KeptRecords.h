@@ -5,6 +5,7 @@
 
 #include "Platform/Bytes.h"
 
+#include <algorithm>
 #include <cstddef>
 #include <cstdint>
 #include <vector>
@@ -43,10 +44,21 @@ public:
         return _kept[view].isPending() && (_kept[view].parts & ~parts) != 0;
     }
     /// Keeps a record. Whether all has to be written now, since it has parts that were never written.
-    [[nodiscard]] bool keep(std::size_t view, Bytes bytes, Parts parts);
+    [[nodiscard]] bool keep(std::size_t view, Bytes bytes, Parts parts) {
+        Kept& kept = _kept[view];
+        if (kept.bytes.size() != bytes.size()) // most records of a view are as long as the one before
+            kept.bytes.resize(bytes.size());
+        std::copy(bytes.begin(), bytes.end(), kept.bytes.begin());
+        kept.parts = parts;
+        kept.order = ++_lastOrder;
+        return (parts & ~kept.shown) != 0;
+    }
     /// Nothing is pending but, perhaps, this view: it replaces what the others would write.
-    void dropAllBut(std::size_t view);
-    void drop(std::size_t view) { _kept[view].order = 0; }
+    void dropAllBut(std::size_t view) {
+        for (std::size_t i = 0; i < _kept.size(); ++i)
+            if (i != view)
+                _kept[i].order = 0;
+    }
     /// Nothing is pending, and nothing has been written: the display is another.
     void clear();
 

@@ -7,6 +7,7 @@
 #include "LogGenerator/GSM/GSMLogGenerator.h"
 #include "LogGenerator/LTE/LTELogGenerator.h"
 #include "LogGenerator/MessageEffects.h"
+#include "LogGenerator/Observations/Observer.h"
 #include "LogGenerator/OstrelGSM/Ostrel_GSMLogGenerator.h"
 #include "LogGenerator/UTRAN/UTRANLogGenerator.h"
 #include "Platform/DateText.h"
@@ -29,6 +30,31 @@ LogGenerator::LogGenerator(const Clock& clock) : _clock(clock) {
 void LogGenerator::updateStateReporting(Dictionary& state, const Data& data, MessageEffects& effects) {
     updateState(state, data);
     effects.display(display(state));
+}
+
+LogGenerator::~LogGenerator() = default;
+
+Catalogue& LogGenerator::catalogue() {
+    if (!_catalogue) {
+        _catalogue = std::make_unique<Catalogue>(shortTechnologyName(technology()));
+        describe(*_catalogue);
+    }
+    return *_catalogue;
+}
+
+void LogGenerator::setObservationSink(ObservationSink* sink) {
+    _sink = sink;
+    if (sink) {
+        static_cast<void>(catalogue());
+        if (!_observer)
+            _observer = std::make_unique<Observer>();
+    }
+    observe(observer());
+}
+
+void LogGenerator::passObservations(std::optional<std::uint32_t> code,
+                                    std::optional<std::uint64_t> timestamp) {
+    _sink->observed(_observer->message(_clock.now(), code, timestamp));
 }
 
 Value LogGenerator::display(Dictionary& state) {

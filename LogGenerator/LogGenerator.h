@@ -6,12 +6,17 @@
 #include "Platform/Clock.h"
 #include "PropertyLists/Value.h"
 
+#include <cstdint>
 #include <memory>
+#include <optional>
 #include <string_view>
 
 namespace velmora {
 
+class Catalogue;
 class MessageEffects;
+class ObservationSink;
+class Observer;
 
 /// A technology's log decoder, as the model uses it. Decoders keep what they decode in the state
 /// dictionary that every call gets: the model owns it and it outlives them, so that a new decoder
@@ -24,7 +29,7 @@ class LogGenerator {
 public:
     /// `clock` dates the history and must outlive the decoder.
     explicit LogGenerator(const Clock& clock);
-    virtual ~LogGenerator() = default;
+    virtual ~LogGenerator();
     LogGenerator(const LogGenerator&) = delete;
     LogGenerator& operator=(const LogGenerator&) = delete;
 
@@ -48,6 +53,15 @@ public:
     /// "DisplayState" and "History" are not changed, and a refresh copies nothing.
     void setKeepsHistory(bool keeps) { _keepsHistory = keeps; }
 
+    /// The telephony service's constant for the technology that it decodes; empty for a decoder that no
+    /// technology names.
+    [[nodiscard]] virtual std::string_view technology() const { return {}; }
+    /// Every leaf that its displays can show. Made on the first call.
+    [[nodiscard]] Catalogue& catalogue();
+    /// Who gets the observations of every message from now on; null for nobody, when nothing is computed for
+    /// them. The sink must outlive the decoder or the next call.
+    void setObservationSink(ObservationSink* sink);
+
     /// A new decoder for the technology that the telephony service names by one of its constants; null for
     /// any other name, and where the decoder cannot be made.
     [[nodiscard]] static std::unique_ptr<LogGenerator> generatorFromTechnology(std::string_view technology,
@@ -59,12 +73,24 @@ public:
     static void updateHistoryInState(Dictionary& state, const Clock& clock);
 
 protected:
+    /// Enters the leaves into the catalogue.
+    virtual void describe(Catalogue& /*catalogue*/) {}
+    /// Observations are made with this observer from now on, or not any more (null).
+    virtual void observe(Observer* /*observer*/) {}
+    /// Null where there is no sink.
+    [[nodiscard]] Observer* observer() { return _sink ? _observer.get() : nullptr; }
+    /// Passes what was observed of a message to the sink. Precondition: there is one.
+    void passObservations(std::optional<std::uint32_t> code, std::optional<std::uint64_t> timestamp);
+
     [[nodiscard]] const Clock& clock() const { return _clock; }
     [[nodiscard]] bool keepsHistory() const { return _keepsHistory; }
 
 private:
     const Clock& _clock;
     bool _keepsHistory = true;
+    std::unique_ptr<Catalogue> _catalogue;
+    std::unique_ptr<Observer> _observer; ///< since there was a sink
+    ObservationSink* _sink = nullptr;
 };
 
 } // namespace velmora

@@ -4,6 +4,8 @@
 #include "LogGenerator/OstrelLogGenerator2.h"
 
 #include "LogGenerator/MessageEffects.h"
+#include "LogGenerator/Observations/CatalogueWriter.h"
+#include "LogGenerator/Observations/Observer.h"
 #include "LogMessages/LogMessage.h"
 #include "Platform/Resources.h"
 #include "Platform/SystemLog.h"
@@ -91,6 +93,17 @@ void OstrelLogGenerator2::updateWithData(const Data& message) {
 
 std::optional<std::uint32_t> OstrelLogGenerator2::route(const Data& message) {
     const std::optional<LogMessage> parsed = LogMessage::parse(message.bytes());
+    Observer* const observing = observer();
+    if (!observing)
+        return route(message, parsed);
+    observing->beginMessage();
+    const std::optional<std::uint32_t> code = route(message, parsed);
+    passObservations(code, parsed ? parsed->timestamp() : std::nullopt);
+    return code;
+}
+
+std::optional<std::uint32_t> OstrelLogGenerator2::route(const Data& message,
+                                                        const std::optional<LogMessage>& parsed) {
     if (!parsed)
         return std::nullopt;
     if (parsed->type != LogMessage::basebandType && parsed->type != LogMessage::extraType) {
@@ -179,6 +192,62 @@ Value OstrelLogGenerator2::processTemplate(const Value& object) {
         logLine(LogPriority::Error, "Received an object of unknown type");
         logLine(LogPriority::Warning, "Processing the template");
         return {};
+    }
+}
+
+void OstrelLogGenerator2::describe(Catalogue& catalogue) {
+    const Value source = loadTemplate(pListName);
+    Places places;
+    findSections(source, catalogue.root(), places);
+    // In the order of the display, which is that of the template.
+    describeSections(source, places, catalogue);
+}
+
+void OstrelLogGenerator2::findSections(const Value& object, Catalogue::Node& node, Places& places) const {
+    if (const Dictionary* const dictionary = object.asDictionary()) {
+        for (const auto& [key, value] : *dictionary) {
+            Catalogue::Node& child = node.child(key);
+            if (Base* const section = cIndex->getClass(key))
+                places[section] = {&child, value.asArray() != nullptr};
+            findSections(value, child, places);
+        }
+    }
+}
+
+void OstrelLogGenerator2::describeSections(const Value& object, Places& places, Catalogue& catalogue) {
+    const Dictionary* const dictionary = object.asDictionary();
+    if (!dictionary)
+        return;
+    for (const auto& [key, value] : *dictionary) {
+        if (const auto found = places.find(cIndex->getClass(key)); found != places.end()) {
+            describeSection(*found->first, found->second, catalogue);
+            places.erase(found);
+        }
+        describeSections(value, places, catalogue);
+    }
+}
+
+void OstrelLogGenerator2::describeSection(const Base& section, const Place& place, Catalogue& catalogue) {
+    FieldMap& map = _fieldMaps[&section];
+    map = FieldMap(catalogue, std::string(section.getSectionName()));
+    // What is named for a node of the other kind is not shown.
+    CatalogueWriter writer(catalogue, map, [&place](std::string_view label) {
+        std::vector<Catalogue::Node*> nodes;
+        if (label.empty() == place.isList)
+            nodes.push_back(label.empty() ? place.node : &place.node->child(label));
+        return nodes;
+    });
+    for (const View& view : section.views()) {
+        writer.setCode(view.code);
+        section.describe(view, writer);
+    }
+}
+
+void OstrelLogGenerator2::observe(Observer* observer) {
+    for (const auto& [name, section] : cIndex->classDict) {
+        const auto map = _fieldMaps.find(section);
+        if (map != _fieldMaps.end())
+            section->observe(observer, &map->second);
     }
 }
 

@@ -4,9 +4,13 @@
 #pragma once
 
 #include "LogGenerator/ClassIndex.h"
+#include "LogGenerator/Observations/Catalogue.h"
+#include "LogGenerator/Observations/FieldMap.h"
 #include "LogGenerator/OstrelLogGenerator.h"
+#include "LogMessages/LogMessage.h"
 
 #include <cstdint>
+#include <map>
 #include <memory>
 #include <optional>
 #include <string>
@@ -50,15 +54,31 @@ public:
 
     [[nodiscard]] const ClassIndex& classIndex() const { return *cIndex; }
 
+protected:
+    void describe(Catalogue& catalogue) override;
+    void observe(Observer* observer) override;
+
 private:
+    /// Where a section's node is in the template, and its kind.
+    struct Place {
+        Catalogue::Node* node;
+        bool isList;
+    };
+    /// The last of two places of the same section.
+    using Places = std::map<const Base*, Place>;
+    void findSections(const Value& object, Catalogue::Node& node, Places& places) const;
+    void describeSections(const Value& object, Places& places, Catalogue& catalogue);
+    void describeSection(const Base& section, const Place& place, Catalogue& catalogue);
     /// Does what `updateWithData` does. Returns the code; none for a message that was dropped.
     std::optional<std::uint32_t> route(const Data& message);
+    std::optional<std::uint32_t> route(const Data& message, const std::optional<LogMessage>& parsed);
     /// Sets the nodes of this decoder's sections to those of a display that an earlier decoder built.
     void attachSections(const Value& object);
 
     std::string pListName;
     std::shared_ptr<ClassIndex> cIndex;
     bool _sectionsAttached = false;
+    std::map<const Base*, FieldMap> _fieldMaps; ///< of the sections that the template has
 };
 
 } // namespace velmora

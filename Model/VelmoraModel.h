@@ -65,7 +65,7 @@ public:
     /// The "GetTechnology" exchange. The decoder changes only when the answer names a technology (to none
     /// where no decoder knows it); after any other outcome the decoder of an earlier connection is kept.
     void configureGenerator();
-    /// The whole start sequence with its retry; nothing while monitoring is running.
+    /// The complete start sequence with its retry; nothing while monitoring is running.
     void startMonitor();
     void restartMonitor();
 

@@ -18,7 +18,7 @@ using NodeRef = std::shared_ptr<const VelmoraModelNode>;
 /// The key that makes a display dictionary a sorted one. It is no row itself.
 inline constexpr std::string_view sortedMarker = "_sorted";
 
-/// The name that a key of a sorted dictionary shows: what follows its one ";", else the whole key.
+/// The name that a key of a sorted dictionary shows: what follows its one ";", else the entire key.
 [[nodiscard]] std::string_view nameOfSortedKey(std::string_view key);
 
 /// Path ("/", "/Serving Cell/0") to the node built for it.

@@ -73,23 +73,12 @@ Result<std::unique_ptr<MessageReader>> openUnpacked(ChunkedInput input) {
 
 } // namespace
 
-Result<std::unique_ptr<MessageReader>> openMessages(const std::string& path) {
-    Result<std::unique_ptr<ByteSource>> source = FileSource::open(path);
+Result<std::unique_ptr<MessageReader>> openMessages(const std::string& path,
+                                                    std::function<void()> beforeWaiting) {
+    Result<std::unique_ptr<ByteSource>> source = FileSource::open(path, std::move(beforeWaiting));
     if (!source)
         return Failure{source.reason()};
     return openMessages(ChunkedInput(*std::move(source)));
-}
-
-std::vector<std::string> technologiesOf(const std::string& path) {
-    std::error_code error;
-    if (path == "-" || !std::filesystem::is_regular_file(path, error))
-        return {};
-    const Result<std::unique_ptr<MessageReader>> reader = openMessages(path);
-    if (!reader || !dynamic_cast<PcapngReader*>(reader->get()))
-        return {};
-    while ((*reader)->next()) {
-    }
-    return (*reader)->technologies();
 }
 
 Result<std::unique_ptr<MessageReader>> openMessages(ChunkedInput input) {
@@ -102,6 +91,21 @@ Result<std::unique_ptr<MessageReader>> openMessages(ChunkedInput input) {
     if (reader)
         (*reader)->setCompressed();
     return reader;
+}
+
+std::vector<std::string> technologiesOf(const std::string& path) {
+    std::error_code error;
+    if (path == "-" || !std::filesystem::is_regular_file(path, error))
+        return {};
+    const Result<std::unique_ptr<MessageReader>> reader = openMessages(path);
+    if (!reader)
+        return {};
+    (*reader)->setReadsAllTechnologies(true);
+    while ((*reader)->next()) {
+    }
+    std::vector<std::string> names = (*reader)->technologies();
+    std::erase(names, std::string());
+    return names;
 }
 
 } // namespace velmora

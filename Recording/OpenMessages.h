@@ -7,6 +7,7 @@
 #include "Recording/Files/ChunkedInput.h"
 #include "Recording/MessageReader.h"
 
+#include <functional>
 #include <memory>
 #include <string>
 #include <vector>
@@ -16,12 +17,15 @@ namespace velmora {
 /// Opens a file of log messages - a recording, a snapshot, a DLF log - recognising its form by its first
 /// bytes, never by its name. A gzip'd one is unpacked as it is read. "-" is standard input. The reason does
 /// not repeat the path.
-Result<std::unique_ptr<MessageReader>> openMessages(const std::string& path);
+/// `beforeWaiting` is called, in calls of the reader, whenever it waits for more of the input; it may be
+/// null.
+Result<std::unique_ptr<MessageReader>> openMessages(const std::string& path,
+                                                    std::function<void()> beforeWaiting = {});
 /// As above, for an input of which nothing has been skipped.
 Result<std::unique_ptr<MessageReader>> openMessages(ChunkedInput input);
 
-/// The technologies that a recording names, all of which is read for that; none for other forms, which hold
-/// one at most, for a file that is not a regular one, and for one that cannot be read.
+/// The technologies that a file names or is recognised by, all of which is read for that; none for a file
+/// that is not a regular one, and for one that cannot be read.
 [[nodiscard]] std::vector<std::string> technologiesOf(const std::string& path);
 
 } // namespace velmora

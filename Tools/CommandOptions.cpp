@@ -3,7 +3,7 @@
 
 #include "Tools/CommandOptions.h"
 
-#include "Platform/TelephonyService.h"
+#include "Tools/Technologies.h"
 
 #include <algorithm>
 #include <cstdint>
@@ -39,13 +39,30 @@ CLI::Validator positiveCount() {
         "a number above 0");
 }
 
+CLI::Validator positiveSeconds() {
+    return validator(
+        [](const std::string& text) {
+            double seconds = 0;
+            return CLI::detail::lexical_cast(text, seconds) && seconds >= 0.001 && seconds <= 2e6;
+        },
+        "seconds from 0.001 to 2000000");
+}
+
 void addTechnology(CLI::App& command, std::string& technology, const std::string& purpose) {
+    addTechnologyOption(command, technology,
+                        purpose +
+                            " this technology, overriding the file's; of a file of several technologies, "
+                            "this one alone");
+}
+
+void addTechnologyOption(CLI::App& command, std::string& technology, const std::string& description) {
     command
-        .add_option("--technology", technology,
-                    purpose +
-                        " this technology, overriding the file's; of a file of several technologies, this "
-                        "one alone: " +
-                        technologyNames())
+        .add_option_function<std::string>(
+            "--technology",
+            [&technology](const std::string& text) { technology = technologyMeantBy(text).value_or(text); },
+            description + ": " + technologyForms())
+        ->check(validator([](const std::string& text) { return technologyMeantBy(text).has_value(); },
+                          "one of " + technologyForms()))
         ->type_name("NAME");
 }
 

@@ -20,8 +20,12 @@ namespace velmora {
 [[nodiscard]] CLI::Validator oneOf(const std::vector<std::string>& words);
 /// A whole number above 0.
 [[nodiscard]] CLI::Validator positiveCount();
+/// A time in seconds, at most what the event loop's timers hold, which is 24 days.
+[[nodiscard]] CLI::Validator positiveSeconds();
 
 /// `--technology`, with a description that begins with `purpose`.
 void addTechnology(CLI::App& command, std::string& technology, const std::string& purpose);
+/// The same with a description of its own, which the names follow.
+void addTechnologyOption(CLI::App& command, std::string& technology, const std::string& description);
 
 } // namespace velmora

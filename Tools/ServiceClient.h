@@ -10,6 +10,8 @@
 #include "Platform/Linux/Ports/LinuxTelephonyService.h"
 #include "Platform/Linux/QtMainQueue.h"
 
+#include <string>
+
 namespace velmora {
 
 /// What a command needs to talk to the telephony service: the event loop and the machine's ports, queue and
@@ -29,5 +31,14 @@ public:
 
 /// The other end's name in messages.
 inline constexpr const char* serviceTitle = "the telephony service";
+
+/// How to start a service, where none answers.
+inline constexpr const char* serviceAdvice =
+    "start one with velmora-telephonyd --source modemmanager (the modem) or "
+    "velmora-telephonyd --source scenario:gsm,seed=1 (a synthetic drive)";
+
+/// Why a command ends that has waited for the service: the problem with the connection, empty where there was
+/// none but no message came, and what to do.
+[[nodiscard]] std::string timeoutMessage(const std::string& problem, double seconds);
 
 } // namespace velmora

@@ -6,12 +6,17 @@
 #include "LogGenerator/C2K/LogCodeParsers.h"
 #include "LogGenerator/C2K/ValueVisitor.h"
 #include "LogGenerator/MessageEffects.h"
+#include "LogGenerator/Observations/CatalogueWriter.h"
+#include "LogGenerator/Observations/Observer.h"
 #include "LogMessages/LogMessage.h"
 #include "Platform/Resources.h"
 #include "Platform/SystemLog.h"
 
 #include "PropertyLists/PropertyList.h"
 #include <exception>
+#include <functional>
+#include <map>
+#include <vector>
 
 namespace velmora {
 
@@ -52,6 +57,24 @@ private:
 
     MessageEffects& _effects;
 };
+
+/// The nodes that show each value key, by the template.
+using Places = std::map<std::string, std::vector<Catalogue::Node*>, std::less<>>;
+
+void findPlaces(const Dictionary& source, Catalogue::Node& node, Catalogue& catalogue, Places& places) {
+    for (const auto& [label, value] : source) {
+        if (const Dictionary* const screen = value.asDictionary()) {
+            findPlaces(*screen, node.child(label), catalogue, places);
+        } else if (const std::string* const key = value.asString(); key && *key != sortedMarker) {
+            Catalogue::Node& shown = node.child(label);
+            // The template's own text is shown until there is a value.
+            CatalogueField& leaf = catalogue.leafAt(shown, "");
+            leaf.kind = ObservedKind::Absent;
+            leaf.absentTexts.emplace_back();
+            places[*key].push_back(&shown);
+        }
+    }
+}
 
 /// Adds a label to those that show the value key.
 void addTarget(Dictionary& lookup, std::string_view valueKey, std::string_view label,
@@ -109,6 +132,16 @@ void C2KLogGenerator::update(Dictionary& state, const Data& data, MessageEffects
 void C2KLogGenerator::updateFromLog(const Data& data, const DictionaryRef& lookup, Dictionary& state,
                                     MessageEffects* effects) {
     const std::optional<LogMessage> message = LogMessage::parse(data.bytes());
+    if (Observer* const observing = observer())
+        observing->beginMessage();
+    decode(data, message, lookup, state, effects);
+    if (observer())
+        passObservations(message ? std::optional(message->logCode()) : std::nullopt,
+                         message ? message->timestamp() : std::nullopt);
+}
+
+void C2KLogGenerator::decode(const Data& data, const std::optional<LogMessage>& message,
+                             const DictionaryRef& lookup, Dictionary& state, MessageEffects* effects) {
     if (effects)
         effects->values(message ? std::optional(message->logCode()) : std::nullopt);
     if (!message)
@@ -126,6 +159,9 @@ void C2KLogGenerator::updateFromLog(const Data& data, const DictionaryRef& looku
             EffectsVisitor visitor(*effects);
             parser->decode(*reading, visitor);
         }
+        if (Observer* const observing = observer())
+            if (observing->beginSection(_fieldMap, message->logCode()))
+                parser->decode(*reading, *observing);
         _readings.use(lookup);
         _readings.keep(*parser, *reading);
     }
@@ -142,6 +178,22 @@ Value C2KLogGenerator::generateLogUsingState(Dictionary& state) {
 Value C2KLogGenerator::display(Dictionary& state) {
     _readings.write();
     return state["Display"];
+}
+
+void C2KLogGenerator::describe(Catalogue& catalogue) {
+    const Value source = loadTemplate();
+    Places places;
+    if (const Dictionary* const root = source.asDictionary())
+        findPlaces(*root, catalogue.root(), catalogue, places);
+    _fieldMap = FieldMap(catalogue, "");
+    CatalogueWriter writer(catalogue, _fieldMap, [&places](std::string_view valueKey) {
+        const auto found = places.find(valueKey);
+        return found == places.end() ? std::vector<Catalogue::Node*>() : found->second;
+    });
+    for (const C2K::LogCodeParser* const parser : C2K::logCodeParsers()) {
+        writer.setCode(parser->logCode());
+        parser->describe(writer);
+    }
 }
 
 void C2KLogGenerator::processTemplate(const Dictionary& source, const DictionaryRef& display,

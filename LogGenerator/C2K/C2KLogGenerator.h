@@ -4,7 +4,10 @@
 #pragma once
 
 #include "LogGenerator/C2K/KeptReadings.h"
+#include "LogGenerator/Observations/FieldMap.h"
 #include "LogGenerator/OstrelLogGenerator.h"
+#include "LogMessages/LogMessage.h"
+#include "Platform/TelephonyService.h"
 
 namespace velmora {
 
@@ -25,6 +28,9 @@ public:
     ~C2KLogGenerator() override;
     [[nodiscard]] static std::unique_ptr<C2KLogGenerator> generator(const Clock& clock);
 
+    [[nodiscard]] std::string_view technology() const override {
+        return kVoxLogChannelTechnology_Ostrel_CDMA;
+    }
     [[nodiscard]] DictionaryRef getStartCommand() const override;
     void updateState(Dictionary& state, const Data& data) override;
     /// Reports the values that the message published.
@@ -48,10 +54,16 @@ public:
     /// (the next call looks it up again). What a decoder keeps is not written yet: see `display`.
     [[nodiscard]] static Value getDisplayFromState(Dictionary& state);
 
+protected:
+    void describe(Catalogue& catalogue) override;
+
 private:
     void update(Dictionary& state, const Data& data, MessageEffects* effects);
+    void decode(const Data& data, const std::optional<LogMessage>& message, const DictionaryRef& lookup,
+                Dictionary& state, MessageEffects* effects);
 
     C2K::KeptReadings _readings;
+    FieldMap _fieldMap; ///< of the value keys, since there is a catalogue
 };
 
 } // namespace velmora

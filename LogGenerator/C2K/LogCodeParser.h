@@ -5,6 +5,7 @@
 
 #include "LogGenerator/Fields/FieldVisitor.h"
 #include "LogGenerator/KeptRecords.h"
+#include "LogGenerator/Observations/ContentVisitor.h"
 #include "LogMessages/Record.h"
 #include "PropertyLists/Value.h"
 
@@ -42,6 +43,8 @@ public:
     [[nodiscard]] virtual std::optional<Reading> accept(const Record& record, Dictionary& state) const = 0;
     /// Names the values of such a reading to the visitor, in publishing order; those of its parts alone.
     virtual void decode(const Reading& reading, FieldVisitor& visitor) const = 0;
+    /// Describes everything that `decode` may name.
+    virtual void describe(ContentVisitor& visitor) const = 0;
 
 protected:
     LogCodeParser() = default;

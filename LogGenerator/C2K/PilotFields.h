@@ -11,7 +11,7 @@
 namespace velmora::C2K {
 
 /// The energy of a pilot or finger, in dB; a ratio of 0 shows "-inf dB".
-inline constexpr Field pilotEnergy{"", computed, real("%+.2f dB")};
+inline constexpr Field pilotEnergy{"", computed, real("%+.2f dB"), {.absent = "-inf dB"}};
 /// The same of the reference pilot.
 inline constexpr Field referencePilotEnergy{"", computed, real("(ref pilot) %+.2f dB")};
 

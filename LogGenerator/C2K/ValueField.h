@@ -4,6 +4,7 @@
 #pragma once
 
 #include "LogGenerator/Fields/FieldVisitor.h"
+#include "LogGenerator/Observations/ContentVisitor.h"
 
 #include <algorithm>
 #include <cstddef>
@@ -13,14 +14,23 @@
 
 namespace velmora::C2K {
 
-/// When a field is valid. One that is not valid is not read and shows "N/A".
+/// What a field that is not valid shows.
+inline constexpr std::string_view notValid = "N/A";
+
+/// When a field is valid. One that is not valid is not read.
 enum class Validity : std::uint8_t { Always, WhileConnected };
 
 /// One row of a parser's table, in publishing order. The field's label is a value key.
 struct ValueField {
     constexpr ValueField(std::string_view key, const Place& place, const TextFormat& format,
-                         Validity when = Validity::Always)
-        : field{key, place, format}, validity(when) {}
+                         Validity when = Validity::Always, const Meaning& means = {})
+        : field{key, place, format, means}, validity(when) {
+        if (when != Validity::Always)
+            field.means.absent = notValid;
+    }
+    constexpr ValueField(std::string_view key, const Place& place, const TextFormat& format,
+                         const Meaning& means)
+        : ValueField(key, place, format, Validity::Always, means) {}
 
     [[nodiscard]] constexpr bool isValid(bool connected) const {
         return connected || validity == Validity::Always;
@@ -47,8 +57,13 @@ inline void visitFields(std::span<const ValueField> fields, const Record& record
         if (row.isValid(connected))
             visitor.number(row.field, row.field.place.read(record));
         else
-            visitor.text(row.field, "N/A");
+            visitor.text(row.field, notValid);
     }
+}
+
+inline void describeFields(std::span<const ValueField> fields, ContentVisitor& visitor) {
+    for (const ValueField& row : fields)
+        visitor.field(row.field);
 }
 
 } // namespace velmora::C2K

@@ -26,8 +26,8 @@ inline constexpr std::int64_t levelNotMeasured = 32767;
 /// 32 rows.
 struct CellField {
     constexpr CellField(CellKey cellKey, CellNumber part, std::string_view label, const TextFormat& format,
-                        std::string_view failureLine)
-        : key(cellKey), number(part), field{label, computed, format}, failure(failureLine) {}
+                        std::string_view failureLine, const Meaning& means = {})
+        : key(cellKey), number(part), field{label, computed, format, means}, failure(failureLine) {}
 
     CellKey key;
     CellNumber number;

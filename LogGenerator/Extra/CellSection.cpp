@@ -3,6 +3,7 @@
 
 #include "LogGenerator/Extra/CellSection.h"
 
+#include "LogGenerator/Observations/ContentVisitor.h"
 #include "Platform/SystemLog.h"
 
 #include <algorithm>
@@ -10,8 +11,6 @@
 namespace velmora {
 
 namespace {
-
-constexpr List rows{};
 
 bool isOneOf(const CellKind& kind, std::span<const CellKind> kinds) {
     return std::find(kinds.begin(), kinds.end(), kind) != kinds.end();
@@ -75,13 +74,28 @@ void CellSection::decode(const View& view, const Record& record, FieldVisitor& v
             visitCell(cell, table.fields, visitor);
         return;
     }
-    visitor.beginList(rows);
+    visitor.beginList(table.list);
     for (const Cell& cell : _shown) {
         visitor.beginRow();
         visitCell(cell, table.fields, visitor);
         visitor.endRow();
     }
     visitor.endList();
+}
+
+void CellSection::describe(const View& view, ContentVisitor& visitor) const {
+    if (view.code != cellInformation.code) {
+        Base::describe(view, visitor);
+        return;
+    }
+    const CellTable& table = cellTable();
+    const bool isList = table.shown == CellTable::Shown::Rows;
+    if (isList)
+        visitor.beginList(table.list);
+    for (const CellField& row : table.fields)
+        visitor.field(row.field);
+    if (isList)
+        visitor.endList();
 }
 
 } // namespace velmora

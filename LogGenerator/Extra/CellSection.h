@@ -25,6 +25,7 @@ struct CellTable {
     std::span<const CellKind> kinds;
     Shown shown;
     std::span<const CellField> fields;
+    List list{}; ///< with `Rows`: which of the fields identify a row
 };
 
 /// The array among a section's views; its payload is read by CellSection.
@@ -39,6 +40,7 @@ public:
 
     void updateWithData(const Data& data, std::uint32_t logCode) override;
     void decode(const View& view, const Record& record, FieldVisitor& visitor) const override;
+    void describe(const View& view, ContentVisitor& visitor) const override;
 
 protected:
     /// What is shown of the array, a constant.

@@ -10,10 +10,27 @@ namespace velmora {
 
 namespace {
 
-constexpr View contextViews[] = {{ExtraCode::packetDataContexts, std::size_t{0}}};
-// As the telephony service reports them.
-constexpr List contextList{"", List::Entries::Values, ""};
+// As the telephony service reports them: dictionaries whose labels and texts are its own. These are the ones
+// that are known; further ones are shown too.
 constexpr Field context{"", computed, plainText()};
+constexpr Meaning address{.identity = Identity::Address};
+constexpr Field knownFields[] = {
+    {"Context ID", computed, plainText()},
+    {"NSAPI", computed, plainText(), {.clause = "3GPP TS 24.008 10.5.6.2"}},
+    {"APN", computed, plainText(), {.clause = "3GPP TS 23.003 9"}},
+    {"PDP Type", computed, plainText(), {.clause = "3GPP TS 24.008 10.5.6.4"}},
+    {"PDP Address", computed, plainText(), address},
+    {"Primary DNS", computed, plainText(), address},
+    {"Secondary DNS", computed, plainText(), address},
+    {"QoS Traffic Class", computed, plainText(), {.clause = "3GPP TS 24.008 10.5.6.5"}},
+    {"Maximum Bit Rate Uplink", computed, plainText(), {.clause = "3GPP TS 24.008 10.5.6.5"}},
+    {"Maximum Bit Rate Downlink", computed, plainText(), {.clause = "3GPP TS 24.008 10.5.6.5"}},
+};
+constexpr Content contextContents[] = {context, knownFields};
+constexpr std::string_view contextKeys[] = {"Context ID"};
+constexpr List contextList{"", List::Entries::Values, "", contextContents, contextKeys, true};
+constexpr Content contents[] = {contextList};
+constexpr View contextViews[] = {{ExtraCode::packetDataContexts, 0, contents}};
 
 } // namespace
 

@@ -4,6 +4,7 @@
 #include "LogGenerator/Extra/SimInfo.h"
 
 #include "LogGenerator/Extra/ExtraPayload.h"
+#include "LogGenerator/Observations/ContentVisitor.h"
 #include "LogMessages/LogMessage.h"
 #include "Platform/SystemLog.h"
 
@@ -14,8 +15,9 @@ namespace velmora {
 namespace {
 
 struct SIMFile {
-    constexpr SIMFile(std::string_view serviceKey, std::string_view label)
-        : key(serviceKey), field{label, computed, plainText()} {}
+    constexpr SIMFile(std::string_view serviceKey, std::string_view label, Identity identity,
+                      std::string_view clause)
+        : key(serviceKey), field{label, computed, plainText(), {.identity = identity, .clause = clause}} {}
 
     std::string_view key;
     Field field;
@@ -24,20 +26,20 @@ struct SIMFile {
 /// Most of them are elementary files of 3GPP TS 31.102 and TS 51.011; which there are, and with which text,
 /// is as the telephony service reports it.
 constexpr SIMFile simFiles[] = {
-    {"kSimFile_ICCID", "EF-ICCID"},
-    {"kSimFile_MSISDN", "EF-MSISDN"},
-    {"kSimFile_MBDN", "EF-3GPP MAIL BOX DIALING NUMBER"},
-    {"kSimFile_HPPLMN", "EF-HPPLMN SEARCH PERIOD"},
-    {"kSimFile_LOCI", "EF-LOCI"},
-    {"kSimFile_PSLOCI", "EF-GPRS/PS-LOCI"},
-    {"kSimFile_ACC", "EF-ACCESS CONTROL CLASS"},
-    {"kSimFile_AD", "EF-ADMINISTRATIVE DATA"},
-    {"kSimFile_FPLMN", "EF-FPLMN"},
-    {"kSimFile_AHPLMN", "EF-ACTING HPLMN"},
-    {"kSimFile_RATMODE", "EF-RAT MODE"},
-    {"kSimFile_PNN", "EF-PLMN NETWORK NAME"},
-    {"kSimFile_OPL", "EF-OPERATOR PLMN LIST"},
-    {"kSimFile_OPLMNAcT", "EF-OPLMNAcT"},
+    {"kSimFile_ICCID", "EF-ICCID", Identity::Subscriber, "3GPP TS 51.011 10.1.1"},
+    {"kSimFile_MSISDN", "EF-MSISDN", Identity::Subscriber, "3GPP TS 31.102 4.2.26"},
+    {"kSimFile_MBDN", "EF-3GPP MAIL BOX DIALING NUMBER", Identity::Subscriber, "3GPP TS 31.102 4.2.60"},
+    {"kSimFile_HPPLMN", "EF-HPPLMN SEARCH PERIOD", Identity::None, "3GPP TS 31.102 4.2.6"},
+    {"kSimFile_LOCI", "EF-LOCI", Identity::Subscriber, "3GPP TS 31.102 4.2.17"}, // holds the TMSI
+    {"kSimFile_PSLOCI", "EF-GPRS/PS-LOCI", Identity::Subscriber, "3GPP TS 31.102 4.2.23"},
+    {"kSimFile_ACC", "EF-ACCESS CONTROL CLASS", Identity::Subscriber, "3GPP TS 31.102 4.2.15"},
+    {"kSimFile_AD", "EF-ADMINISTRATIVE DATA", Identity::None, "3GPP TS 31.102 4.2.18"},
+    {"kSimFile_FPLMN", "EF-FPLMN", Identity::Location, "3GPP TS 31.102 4.2.16"},
+    {"kSimFile_AHPLMN", "EF-ACTING HPLMN", Identity::None, ""},
+    {"kSimFile_RATMODE", "EF-RAT MODE", Identity::None, ""},
+    {"kSimFile_PNN", "EF-PLMN NETWORK NAME", Identity::None, "3GPP TS 31.102 4.2.58"},
+    {"kSimFile_OPL", "EF-OPERATOR PLMN LIST", Identity::None, "3GPP TS 31.102 4.2.59"},
+    {"kSimFile_OPLMNAcT", "EF-OPLMNAcT", Identity::None, "3GPP TS 31.102 4.2.53"},
 };
 
 constexpr View simFileViews[] = {{ExtraCode::simFiles, std::size_t{0}}};
@@ -72,6 +74,11 @@ void SimInfo::decode(const View&, const Record&, FieldVisitor& visitor) const {
     for (const SIMFile& file : simFiles)
         if (const Value* const value = files->find(file.key))
             visitor.supplied(file.field, *value);
+}
+
+void SimInfo::describe(const View&, ContentVisitor& visitor) const {
+    for (const SIMFile& file : simFiles)
+        visitor.field(file.field);
 }
 
 } // namespace velmora

@@ -17,6 +17,7 @@ public:
     /// An unreadable payload raises LogCode_0xFF0000::UnknownDataException, which ends the program.
     void updateWithData(const Data& data, std::uint32_t logCode) override;
     void decode(const View& view, const Record& record, FieldVisitor& visitor) const override;
+    void describe(const View& view, ContentVisitor& visitor) const override;
 
 private:
     void trace() const override;

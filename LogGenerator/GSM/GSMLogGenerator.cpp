@@ -4,6 +4,8 @@
 #include "LogGenerator/GSM/GSMLogGenerator.h"
 
 #include "LogGenerator/GSM/AssertionFailure.h"
+#include "LogGenerator/GSM/KnownFields.h"
+#include "LogGenerator/Observations/Observer.h"
 #include "PropertyLists/PropertyList.h"
 
 namespace velmora {
@@ -55,13 +57,26 @@ Value GSMLogGenerator::canCollapse(const Value& object) const {
 }
 
 void GSMLogGenerator::updateState(Dictionary& state, const Data& data) {
+    Observer* const observing = observer();
+    if (observing)
+        observing->beginMessage();
     Result<Value> object = readPropertyList(data.bytes());
     if (!object)
         throw AssertionFailure("Could not deserialize the object", assertionFile, notDeserializedLine);
     Value display = processObject(*object);
     state.set("DisplayState", *std::move(object));
+    if (observing) {
+        observing->display(catalogue(), display);
+        passObservations(std::nullopt, std::nullopt);
+    }
     state.set("Display", std::move(display));
     state.set("ExtraInfo", makeDictionary());
+}
+
+void GSMLogGenerator::describe(Catalogue& catalogue) {
+    catalogue.setReadsNumbersFromTexts();
+    catalogue.root().setOpen();
+    describeKnownFields(catalogue);
 }
 
 Value GSMLogGenerator::generateLogUsingState(Dictionary& state) {

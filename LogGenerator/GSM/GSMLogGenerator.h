@@ -4,6 +4,7 @@
 #pragma once
 
 #include "LogGenerator/LogGenerator.h"
+#include "Platform/TelephonyService.h"
 
 namespace velmora {
 
@@ -15,6 +16,7 @@ public:
     using LogGenerator::LogGenerator;
     [[nodiscard]] static std::unique_ptr<GSMLogGenerator> generator(const Clock& clock);
 
+    [[nodiscard]] std::string_view technology() const override { return kVoxLogChannelTechnology_IFX; }
     /// Raises AssertionFailure for a message that is no property list or holds any other kind of value.
     void updateState(Dictionary& state, const Data& data) override;
     [[nodiscard]] Value generateLogUsingState(Dictionary& state) override;
@@ -27,6 +29,10 @@ public:
 
     /// The single value of a dictionary with exactly one entry, none for anything else.
     [[nodiscard]] Value canCollapse(const Value& object) const;
+
+protected:
+    /// The leaves that are known; what else the trees hold is added when it is first seen.
+    void describe(Catalogue& catalogue) override;
 };
 
 } // namespace velmora

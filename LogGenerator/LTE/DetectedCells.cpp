@@ -11,7 +11,10 @@ namespace {
 
 // 0xB179: physical cell identity (3GPP TS 36.211 6.11).
 constexpr Field cellFields[] = {
-    {"Physical Cell ID", u16At(0), integer("%d")},
+    {"Physical Cell ID",
+     u16At(0),
+     integer("%d"),
+     {.role = Role::NeighbourPhysicalCell, .clause = "3GPP TS 36.211 6.11"}},
 };
 constexpr Layout cell = layout(IntraFrequencyRecord::detectedLength, cellFields);
 

@@ -3,6 +3,8 @@
 
 #include "LogGenerator/LTE/IntraFrequencyList.h"
 
+#include "LogGenerator/Observations/ContentVisitor.h"
+
 namespace velmora {
 
 using LTE::IntraFrequencyRecord;
@@ -10,7 +12,8 @@ using LTE::IntraFrequencyRecord;
 namespace {
 
 constexpr View sectionViews[] = {{IntraFrequencyRecord::code, IntraFrequencyRecord::minimumLength}};
-constexpr List rows{};
+constexpr std::string_view cellKeys[] = {"Physical Cell ID"};
+constexpr List rows{.keys = cellKeys};
 
 } // namespace
 
@@ -26,6 +29,12 @@ void IntraFrequencyList::check(const View& view, const Record& record) const {
 void IntraFrequencyList::decode(const View&, const Record& record, FieldVisitor& visitor) const {
     const IntraFrequencyRecord measurement(record);
     visitor.rows(rows, (measurement.*_cells)(), _cell);
+}
+
+void IntraFrequencyList::describe(const View&, ContentVisitor& visitor) const {
+    visitor.beginList(rows);
+    visitor.fields(_cell.fields);
+    visitor.endList();
 }
 
 } // namespace velmora

@@ -14,6 +14,7 @@ class IntraFrequencyList : public Base {
 public:
     [[nodiscard]] std::span<const View> views() const final;
     void decode(const View& view, const Record& record, FieldVisitor& visitor) const final;
+    void describe(const View& view, ContentVisitor& visitor) const final;
 
 protected:
     using Cells = const CountedList& (LTE::IntraFrequencyRecord::*)() const;

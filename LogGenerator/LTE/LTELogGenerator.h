@@ -4,6 +4,7 @@
 #pragma once
 
 #include "LogGenerator/OstrelLogGenerator2.h"
+#include "Platform/TelephonyService.h"
 
 namespace velmora {
 
@@ -12,6 +13,7 @@ class LTELogGenerator final : public OstrelLogGenerator2 {
 public:
     explicit LTELogGenerator(const Clock& clock);
     ~LTELogGenerator() override;
+    [[nodiscard]] std::string_view technology() const override { return kVoxLogChannelTechnology_Ostrel_LTE; }
     [[nodiscard]] static std::unique_ptr<LTELogGenerator> generator(const Clock& clock);
 };
 

@@ -28,37 +28,72 @@ constexpr std::uint32_t antennaCode = 0xB0C1;
 constexpr std::uint32_t cellCode = 0xB0C2;
 constexpr std::size_t cellMinimumLength = 38;
 constexpr Field carrierFields[] = {
-    {"Physical Cell ID", u16At(14), integer("%d")},
-    {"Download Frequency", u16At(16), integer("%d")},
-    {"Upload Frequency", u16At(18), integer("%d")},
+    {"Physical Cell ID",
+     u16At(14),
+     integer("%d"),
+     {.role = Role::ServingPhysicalCell, .clause = "3GPP TS 36.211 6.11"}},
+    {"Download Frequency",
+     u16At(16),
+     integer("%d"),
+     {.role = Role::ServingChannel, .clause = "3GPP TS 36.101 5.7.3"}},
+    {"Upload Frequency", u16At(18), integer("%d"), {.clause = "3GPP TS 36.101 5.7.3"}},
 };
 constexpr Layout carrier = layout(cellMinimumLength, carrierFields);
 constexpr Field identityFields[] = {
-    {"Download Bandwidth", u8At(20), text(bandwidths)}, {"Upload Bandwidth", u8At(21), text(bandwidths)},
-    {"Cell Identity", u32At(22), integer("%d")},        {"Tracking Area Code", u16At(26), integer("%d")},
-    {"Freq Band Indicator", u32At(28), integer("%d")},
+    {"Download Bandwidth", u8At(20), text(bandwidths), {.clause = "3GPP TS 36.101 5.6"}},
+    {"Upload Bandwidth", u8At(21), text(bandwidths), {.clause = "3GPP TS 36.101 5.6"}},
+    {"Cell Identity",
+     u32At(22),
+     integer("%d"),
+     {.role = Role::ServingCell, .identity = Identity::Location, .clause = "3GPP TS 23.003 19.6"}},
+    {"Tracking Area Code",
+     u16At(26),
+     integer("%d"),
+     {.role = Role::ServingArea, .identity = Identity::Location, .clause = "3GPP TS 23.003 19.4.2.3"}},
+    {"Freq Band Indicator", u32At(28), integer("%d"), {.clause = "3GPP TS 36.101 5.5"}},
 };
 constexpr Layout identity = layout(cellMinimumLength, identityFields);
 
 // As the telephony service reports it.
 constexpr CellField servingCellFields[] = {
-    {kVoxCellMonitorTAC, CellNumber::Whole, "Tracking Area Code", integer("%d"),
-     "Serving Cell Info: Failed to retrieve TAC\n"},
-    {kVoxCellMonitorCellId, CellNumber::Whole, "Cell Identity", integer("%d"),
-     "Serving Cell Info: Failed to retrieve Cell ID\n"},
-    {kVoxCellMonitorPID, CellNumber::Whole, "Physical Cell ID", integer("%d"),
-     "Serving Cell Info: Failed to retrieve Physical Cell ID\n"},
-    {kVoxCellMonitorBandInfo, CellNumber::Whole, "Freq Band Indicator", integer("%d"),
-     "Serving Cell Info: Failed to retrieve Freq Band Indicator\n"},
-    {kVoxCellMonitorUARFCN, CellNumber::Whole, "UARFCN", integer("%d"),
-     "Serving Cell Info: Failed to retrieve UARFCN\n"},
+    {kVoxCellMonitorTAC,
+     CellNumber::Whole,
+     "Tracking Area Code",
+     integer("%d"),
+     "Serving Cell Info: Failed to retrieve TAC\n",
+     {.role = Role::ServingArea, .identity = Identity::Location, .clause = "3GPP TS 23.003 19.4.2.3"}},
+    {kVoxCellMonitorCellId,
+     CellNumber::Whole,
+     "Cell Identity",
+     integer("%d"),
+     "Serving Cell Info: Failed to retrieve Cell ID\n",
+     {.role = Role::ServingCell, .identity = Identity::Location, .clause = "3GPP TS 23.003 19.6"}},
+    {kVoxCellMonitorPID,
+     CellNumber::Whole,
+     "Physical Cell ID",
+     integer("%d"),
+     "Serving Cell Info: Failed to retrieve Physical Cell ID\n",
+     {.role = Role::ServingPhysicalCell, .clause = "3GPP TS 36.211 6.11"}},
+    {kVoxCellMonitorBandInfo,
+     CellNumber::Whole,
+     "Freq Band Indicator",
+     integer("%d"),
+     "Serving Cell Info: Failed to retrieve Freq Band Indicator\n",
+     {.clause = "3GPP TS 36.101 5.5"}},
+    {kVoxCellMonitorUARFCN,
+     CellNumber::Whole,
+     "UARFCN",
+     integer("%d"),
+     "Serving Cell Info: Failed to retrieve UARFCN\n",
+     {.role = Role::ServingChannel, .clause = "3GPP TS 36.101 5.7.3"}},
 };
 constexpr CellKind cellKinds[] = {
     {kVoxCellMonitorRadioAccessTechnologyLTE, kVoxCellMonitorCellTypeServing},
 };
 constexpr CellTable servingCell{cellKinds, CellTable::Shown::First, servingCellFields};
+constexpr Content cellContents[] = {carrier, identity};
 constexpr View sectionViews[] = {
-    {cellCode, carrier.minimumLength},
+    {cellCode, carrier.minimumLength, cellContents},
     {antennaCode, antennas},
     cellInformation,
 };

@@ -11,9 +11,18 @@ namespace {
 
 // 0xB179: physical cell identity (3GPP TS 36.211 6.11); level and quality: see Records.h.
 constexpr Field cellFields[] = {
-    {"Physical Cell ID", u16At(0), integer("%d")},
-    {"Filtered RSRP", u16At(2), LTE::filteredRSRP},
-    {"Filtered RSRQ", u16At(4), LTE::filteredRSRQ},
+    {"Physical Cell ID",
+     u16At(0),
+     integer("%d"),
+     {.role = Role::NeighbourPhysicalCell, .clause = "3GPP TS 36.211 6.11"}},
+    {"Filtered RSRP",
+     u16At(2),
+     LTE::filteredRSRP,
+     {.role = Role::NeighbourLevel, .clause = "3GPP TS 36.214 5.1.1"}},
+    {"Filtered RSRQ",
+     u16At(4),
+     LTE::filteredRSRQ,
+     {.role = Role::NeighbourQuality, .clause = "3GPP TS 36.214 5.1.3"}},
 };
 constexpr Layout cell = layout(IntraFrequencyRecord::neighbourLength, cellFields);
 

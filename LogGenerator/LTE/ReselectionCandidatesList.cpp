@@ -23,7 +23,7 @@ constexpr Place ratType = u16At(2);
 
 // Reselection priority (3GPP TS 36.304 5.2.4.1).
 constexpr Field headerFields[] = {
-    {"Candidate Priority", u16At(0), integer("%d")},
+    {"Candidate Priority", u16At(0), integer("%d"), {.clause = "3GPP TS 36.304 5.2.4.1"}},
     {"Candidate RAT Type", ratType, text(ratTypes)},
 };
 constexpr Layout header = layout(ReselectionRecord::stride, headerFields);
@@ -33,22 +33,25 @@ constexpr Layout header = layout(ReselectionRecord::stride, headerFields);
 // 25.101 5.4.3), primary scrambling code (TS 25.213 5.2.2); ARFCN (TS 45.005 2), BSIC (TS 23.003 4.3.2); band
 // class (3GPP2 C.S0057), pilot PN offset (3GPP2 C.S0005). The GERAN band is the modem's number.
 constexpr Field lteFields[] = {
-    {"E ARFCN", u16At(4), integer("%d")}, // with a blank, unlike the other sections' "E-ARFCN"
-    {"Cell ID", bitsAt(6, 7, 9), integer("%d")},
+    {"E ARFCN",
+     u16At(4),
+     integer("%d"),
+     {.clause = "3GPP TS 36.101 5.7.3"}}, // with a blank, unlike the other sections' "E-ARFCN"
+    {"Cell ID", bitsAt(6, 7, 9), integer("%d"), {.clause = "3GPP TS 36.211 6.11"}},
 };
 constexpr Field utranFields[] = {
-    {"U ARFCN", u16At(4), integer("%d")},
-    {"PSC", u16At(6), integer("%d")},
+    {"U ARFCN", u16At(4), integer("%d"), {.clause = "3GPP TS 25.101 5.4.3"}},
+    {"PSC", u16At(6), integer("%d"), {.clause = "3GPP TS 25.213 5.2.2"}},
 };
 constexpr Field geranFields[] = {
-    {"ARFCN", u16At(4), integer("%d")},
+    {"ARFCN", u16At(4), integer("%d"), {.clause = "3GPP TS 45.005 2"}},
     {"Band", u8At(6), integer("%d")},
-    {"BSIC ID", u8At(7), integer("%d")},
+    {"BSIC ID", u8At(7), integer("%d"), {.clause = "3GPP TS 23.003 4.3.2"}},
 };
 constexpr Field cdmaFields[] = {
     {"Band", u8At(4), integer("%d")},
-    {"Channel", u16At(8), integer("%d")},
-    {"Pilot", u16At(10), integer("%d")},
+    {"Channel", u16At(8), integer("%d"), {.clause = "3GPP2 C.S0057"}},
+    {"Pilot", u16At(10), integer("%d"), {.clause = "3GPP2 C.S0005"}},
 };
 /// By RAT type; the lengths are the candidate's, header included.
 constexpr Layout details[] = {
@@ -72,8 +75,11 @@ std::size_t completeCandidates(const ReselectionRecord& reselection, const Count
     return i;
 }
 
-constexpr List rows{};
-constexpr View sectionViews[] = {{ReselectionRecord::code, ReselectionRecord::minimumLength}};
+// Two technologies have a "Band" and two an "ARFCN"; a row has those of one.
+constexpr Content candidateContents[] = {header, lteFields, utranFields, geranFields, cdmaFields};
+constexpr List rows{.contents = candidateContents};
+constexpr Content contents[] = {rows};
+constexpr View sectionViews[] = {{ReselectionRecord::code, ReselectionRecord::minimumLength, contents}};
 
 } // namespace
 

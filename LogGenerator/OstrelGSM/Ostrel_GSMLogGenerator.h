@@ -4,6 +4,7 @@
 #pragma once
 
 #include "LogGenerator/OstrelLogGenerator2.h"
+#include "Platform/TelephonyService.h"
 
 namespace velmora {
 
@@ -12,6 +13,7 @@ class Ostrel_GSMLogGenerator final : public OstrelLogGenerator2 {
 public:
     explicit Ostrel_GSMLogGenerator(const Clock& clock);
     ~Ostrel_GSMLogGenerator() override;
+    [[nodiscard]] std::string_view technology() const override { return kVoxLogChannelTechnology_Ostrel_GSM; }
     [[nodiscard]] static std::unique_ptr<Ostrel_GSMLogGenerator> generator(const Clock& clock);
 };
 

@@ -45,7 +45,7 @@ inline constexpr EnumTexts mmStates(mmStateRows, "Unknown");
 
 /// 0x7132, registration, as the modem reports it: what `ProcessCS`, `ProcessPS` and `ProcessCO` show of it.
 inline constexpr Field registrationFields[] = {
-    {"MM Service State", u8At(13), text(registrationStates)},
+    {"MM Service State", u8At(13), text(registrationStates), {.role = Role::RegistrationState}},
 };
 inline constexpr Layout registration = layout(16, registrationFields);
 

@@ -25,8 +25,12 @@ constexpr Field ratio[] = {
     {"", u8At(5), integer("%d")}, {"", u8At(6), integer("%d")}, {"", u8At(7), integer("%d")},
 };
 static_assert(ratio[5].place.end() == quality::compositeChannelLength);
-constexpr List rows{};
-constexpr List ratios{"SIR", List::Entries::Values, ""};
+constexpr Content ratioContents[] = {ratio};
+constexpr List ratios{"SIR", List::Entries::Values, "", ratioContents};
+constexpr Content channelContents[] = {channel, ratios};
+constexpr std::string_view channelKeys[] = {"CCTRCH ID"};
+constexpr List rows{.contents = channelContents, .keys = channelKeys};
+constexpr Content contents[] = {rows};
 
 CountedList compositeChannels(const Record& record) {
     const auto transportChannels = static_cast<std::size_t>(quality::transportChannels.read(record));
@@ -35,7 +39,7 @@ CountedList compositeChannels(const Record& record) {
                        static_cast<std::size_t>(quality::compositeChannels.read(record)));
 }
 
-constexpr View sectionViews[] = {{quality::code, quality::minimumLength}};
+constexpr View sectionViews[] = {{quality::code, quality::minimumLength, contents}};
 
 } // namespace
 

@@ -18,14 +18,17 @@ constexpr Field channelFields[] = {
     {"TRCH BLER Measurement", u8At(1), integer("%d")},
 };
 constexpr Layout channel = layout(quality::transportChannelLength, channelFields);
-constexpr List rows{};
+constexpr Content channelContents[] = {channel};
+constexpr std::string_view channelKeys[] = {"TRCH ID"};
+constexpr List rows{.contents = channelContents, .keys = channelKeys};
+constexpr Content contents[] = {rows};
 
 CountedList channels(const Record& record) {
     return CountedList(record, quality::minimumLength, quality::transportChannelLength,
                        static_cast<std::size_t>(quality::transportChannels.read(record)));
 }
 
-constexpr View sectionViews[] = {{quality::code, quality::minimumLength}};
+constexpr View sectionViews[] = {{quality::code, quality::minimumLength, contents}};
 
 } // namespace
 

@@ -4,6 +4,7 @@
 #pragma once
 
 #include "LogGenerator/OstrelLogGenerator2.h"
+#include "Platform/TelephonyService.h"
 
 namespace velmora {
 
@@ -12,6 +13,9 @@ namespace velmora {
 class UTRANLogGenerator final : public OstrelLogGenerator2 {
 public:
     /// Null, with an error line, where there is no such template.
+    [[nodiscard]] std::string_view technology() const override {
+        return kVoxLogChannelTechnology_Ostrel_UTRAN2;
+    }
     [[nodiscard]] static std::unique_ptr<UTRANLogGenerator> generator(const Clock& clock);
 
 private:

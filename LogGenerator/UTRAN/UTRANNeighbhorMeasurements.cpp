@@ -20,8 +20,14 @@ constexpr std::size_t entryLength = 16;
 // UARFCN (3GPP TS 25.102 5.4.3), cell parameter ID (TS 25.223), P-CCPCH RSCP (a quantity of TS 25.225) in the
 // modem's own steps of 1/256. The fields are packed into the entry's first four bytes.
 constexpr Field cellFields[] = {
-    {"UARFCN", bitsAt(0, 0, 14), integer("%d")},
-    {"Cell ID", bitsAt(1, 6, 7), integer("%d")},
+    {"UARFCN",
+     bitsAt(0, 0, 14),
+     integer("%d"),
+     {.role = Role::NeighbourChannel, .clause = "3GPP TS 25.102 5.4.3"}},
+    {"Cell ID",
+     bitsAt(1, 6, 7),
+     integer("%d"),
+     {.role = Role::NeighbourPhysicalCell, .clause = "3GPP TS 25.223"}},
     {"Filter RSCP", bitsAt(2, 5, 8), real("%f", 0.00390625)},
 };
 constexpr Layout cell = layout(entryLength, cellFields);
@@ -38,13 +44,16 @@ constexpr Field detectionFields[] = {
 };
 constexpr Layout detection = layout(entryLength, detectionFields);
 
-constexpr List rows{};
+constexpr Content cellContents[] = {cell, status, detection};
+constexpr std::string_view cellKeys[] = {"UARFCN", "Cell ID"};
+constexpr List rows{.contents = cellContents, .keys = cellKeys};
+constexpr Content contents[] = {rows};
 
 CountedList cells(const Record& record) {
     return CountedList(record, firstEntry, entryLength, static_cast<std::size_t>(count.read(record)));
 }
 
-constexpr View sectionViews[] = {{0xD00A, minimumLength}};
+constexpr View sectionViews[] = {{0xD00A, minimumLength, contents}};
 
 } // namespace
 

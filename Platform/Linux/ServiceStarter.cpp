@@ -64,7 +64,7 @@ Result<Done> startProgram(std::chrono::milliseconds patience) {
     QProcess service;
     const std::string program = serviceProgram();
     service.setProgram(QString::fromStdString(program));
-    // Named in full, so that the command can be tried by hand.
+    // Named in full, so that the command can be tried manually.
     const std::string named = environmentPath("VELMORA_SOURCE").string();
     const std::string source = named.empty() ? defaultSource : named;
     service.setArguments({"--source", QString::fromStdString(source), "--log", "syslog"});

@@ -7,7 +7,7 @@
 
 namespace velmora {
 
-/// How a program ends on an uncaught exception, out of memory included: with a line that gives the reason,
+/// How a program ends on an uncaught exception, out of memory included: with a line that reports the reason,
 /// and without a core file. Nothing here allocates, since memory may be exhausted.
 
 /// The reason, for a terminate handler: "out of memory", the exception's what(), or that there is no

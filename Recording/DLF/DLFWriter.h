@@ -22,9 +22,9 @@ namespace velmora {
 /// prefix, as in the application's own logs.
 ///
 /// The log keeps no times but those in the records. A message that a reader could not find the end of,
-/// because it has no whole header or its length field is not its length, is refused. Once writing has failed
-/// every call returns that failure again and nothing more is written. Owns its file; destroying it closes it
-/// as `close` does, but reports no failure. Main thread only.
+/// because it has no complete header or its length field is not its length, is refused. Once writing has
+/// failed every call returns that failure again and nothing more is written. Owns its file; destroying it
+/// closes it as `close` does, but reports no failure. Main thread only.
 class DLFWriter {
 public:
     /// Creates the file, or empties it; "-" is standard output, which stays open afterwards. The version
@@ -61,7 +61,7 @@ private:
 
     std::unique_ptr<OutputFile> _file; ///< null when closed
     std::string _name;
-    std::vector<std::uint8_t> _buffer; ///< whole records
+    std::vector<std::uint8_t> _buffer; ///< complete records
     std::uint64_t _messages = 0;
     std::uint64_t _refused = 0;
     std::optional<Failure> _failure;

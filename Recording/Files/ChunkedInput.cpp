@@ -21,8 +21,8 @@ ChunkedInput::ChunkedInput(std::unique_ptr<ByteSource> source, std::size_t chunk
 
 bool ChunkedInput::fill(std::size_t count) {
     while (_end - _begin < count && !_ended) {
-        // Room for twice the bytes that have arrived, not for all that a block's header announces: a few
-        // bytes that announce megabytes must not allocate them.
+        // Room for twice the bytes that have arrived, not for the length in a block's header: a few
+        // bytes that claim megabytes must not allocate them.
         const std::size_t wanted = std::min(count, std::max(2 * (_end - _begin), _chunkSize));
         if (_chunk->size() - _begin < wanted || _chunk->size() - _end < smallestRead)
             nextChunk(wanted);

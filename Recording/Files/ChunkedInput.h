@@ -19,7 +19,7 @@ namespace velmora {
 /// the input without a copy.
 ///
 /// The bytes lie in chunks. `part` returns a window on the chunk itself: it stays valid after the input has
-/// moved on, but keeps its whole chunk in memory; copy a part that is kept for long. A chunk without
+/// moved on, but keeps its entire chunk in memory; copy a part that is kept for long. A chunk without
 /// references is reused. Chunks have the given size, except where one look-ahead requests more: then they
 /// grow with the bytes that arrive, up to about twice that. Main thread only.
 class ChunkedInput {

@@ -5,6 +5,7 @@
 
 #include <cerrno>
 #include <system_error>
+#include <utility>
 
 #include <fcntl.h>
 #include <poll.h>
@@ -12,16 +13,20 @@
 
 namespace velmora {
 
-Result<std::unique_ptr<ByteSource>> FileSource::open(const std::string& path) {
+Result<std::unique_ptr<ByteSource>> FileSource::open(const std::string& path,
+                                                     std::function<void()> beforeWaiting) {
     if (path == "-")
-        return std::unique_ptr<ByteSource>(std::make_unique<FileSource>(STDIN_FILENO, false));
+        return std::unique_ptr<ByteSource>(
+            std::make_unique<FileSource>(STDIN_FILENO, false, std::move(beforeWaiting)));
     const int descriptor = ::open(path.c_str(), O_RDONLY | O_CLOEXEC);
     if (descriptor < 0)
         return Failure{"cannot open: " + std::generic_category().message(errno)};
-    return std::unique_ptr<ByteSource>(std::make_unique<FileSource>(descriptor, true));
+    return std::unique_ptr<ByteSource>(
+        std::make_unique<FileSource>(descriptor, true, std::move(beforeWaiting)));
 }
 
-FileSource::FileSource(int descriptor, bool owned) : _descriptor(descriptor), _owned(owned) {}
+FileSource::FileSource(int descriptor, bool owned, std::function<void()> beforeWaiting)
+    : _descriptor(descriptor), _owned(owned), _beforeWaiting(std::move(beforeWaiting)) {}
 
 FileSource::~FileSource() {
     if (_owned)
@@ -29,6 +34,11 @@ FileSource::~FileSource() {
 }
 
 Result<std::size_t> FileSource::read(std::span<std::uint8_t> buffer) {
+    if (_beforeWaiting) {
+        pollfd readable{_descriptor, POLLIN, 0};
+        if (::poll(&readable, 1, 0) == 0)
+            _beforeWaiting();
+    }
     for (;;) {
         const ssize_t count = ::read(_descriptor, buffer.data(), buffer.size());
         if (count >= 0)

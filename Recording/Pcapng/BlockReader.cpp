@@ -134,7 +134,7 @@ void BlockReader::skipDamage(Fault fault, const Block& block) {
     if (!found)
         _input.skip(_input.available().size());
     loss.bytes = _input.offset() - block.offset;
-    // Where a whole block follows, it was the length that was damaged.
+    // Where a complete block follows, it was the length that was damaged.
     loss.isTruncation = !found && fault == Fault::Truncated && !_input.failure();
     _loss = std::move(loss);
 }

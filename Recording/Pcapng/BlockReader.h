@@ -38,7 +38,7 @@ public:
 
     /// Whether the input begins as a pcapng file does. Call it before the first `next`.
     [[nodiscard]] Result<Done> expectSection();
-    /// The next whole block, valid until the next call; null at the end or once reading has failed.
+    /// The next complete block, valid until the next call; null at the end or once reading has failed.
     [[nodiscard]] const Block* next();
     /// What was skipped before the block, or the end, that `next` last returned; without its record number.
     [[nodiscard]] bool hasLoss() const { return _loss.has_value(); }
@@ -59,7 +59,7 @@ private:
     [[nodiscard]] bool isAtBlock();
 
     ChunkedInput _input;
-    Block _present; ///< what `next` last gave
+    Block _present; ///< what `next` last returned
     bool _bigEndian = false;
     std::optional<Loss> _loss;
 };

@@ -93,7 +93,7 @@ Result<Done> PcapngWriter::append(Time time, Bytes message) {
 Result<Done> PcapngWriter::flush() {
     if (_permanentError)
         return *_permanentError;
-    // What a temporary failure has left after the last whole block is cut off first.
+    // What a temporary failure has left after the last complete block is cut off first.
     if (const int error = _temporaryError ? _file->truncateTo(_end) : 0; error != 0) {
         noteFailure("write", error);
         return outcome();

@@ -5,6 +5,9 @@
 
 _velmora_technologies=(IFX Ostrel_GSM Ostrel_CDMA Ostrel_LTE Ostrel_UTRAN2)
 
+_velmora_roles=(serving serving.{mcc,mnc,area,cell,channel,physical-cell,level,quality} neighbour
+    neighbour.{channel,physical-cell,level,quality} registration.state radio.state block-error-rate data-rate)
+
 # Offers those of the words that begin as the present one does.
 _velmora_offer() {
     local word
@@ -82,7 +85,7 @@ _velmora_log() {
     for ((i = 1; i < cword; ++i)); do
         case ${words[i]} in
         --log | --log-level | --format | --every | --select | --from | --to | --code | --technology | --jobs | \
-            --duration | --count | --description)
+            --duration | --count | --timeout | --description | --role)
             ((++i))
             ;;
         -?*) ;;
@@ -97,11 +100,15 @@ _velmora_log() {
     done
     case $prev in
     --format)
-        if [[ $command == info ]]; then
-            _velmora_offer text json
-        else
-            _velmora_offer text json jsonl csv
-        fi
+        case $command in
+        info) _velmora_offer text json ;;
+        fields) _velmora_offer text json csv ;;
+        *) _velmora_offer text json jsonl csv ;;
+        esac
+        return
+        ;;
+    --role)
+        _velmora_offer "${_velmora_roles[@]}"
         return
         ;;
     --every)
@@ -109,10 +116,10 @@ _velmora_log() {
         return
         ;;
     --technology)
-        _velmora_offer "${_velmora_technologies[@]}"
+        _velmora_offer "${_velmora_technologies[@]}" GSM CDMA LTE UTRAN
         return
         ;;
-    --select | --from | --to | --code | --jobs | --duration | --count | --description)
+    --select | --from | --to | --code | --jobs | --duration | --count | --timeout | --description)
         return # nothing that could be guessed
         ;;
     esac
@@ -124,15 +131,16 @@ _velmora_log() {
         if [[ $cur == -* ]]; then
             _velmora_offer "${options[@]}" --version
         else
-            _velmora_offer decode watch record convert info
+            _velmora_offer decode watch record convert info fields
         fi
         return
         ;;
     decode) options+=(--format --every --select --from --to --code --warm --technology --strict --jobs) ;;
-    watch) options+=(--once) ;;
-    record) options+=(--force --duration --count) ;;
+    watch) options+=(--once --timeout) ;;
+    record) options+=(--force --duration --count --timeout) ;;
     convert) options+=(--force --from --to --code --technology --description --strict) ;;
     info) options+=(--format --technology) ;;
+    fields) options+=(--technology --role --format) ;;
     esac
     if [[ $cur == -* ]]; then
         _velmora_offer "${options[@]}"

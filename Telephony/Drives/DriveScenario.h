@@ -22,8 +22,8 @@ namespace velmora {
 /// are sent periodically; and about every ten seconds a message is unusual (see UnusualMessage). A technology
 /// provides its network, its phone, its phases, reports and records.
 ///
-/// Everything depends only on the seed: the same seed gives the same bytes. Records are stamped as if the
-/// drive had begun on 2026-01-05 at 08:00 UTC. Main thread only.
+/// Everything depends only on the seed: the same seed results in the same bytes. Records are stamped as if
+/// the drive had begun on 2026-01-05 at 08:00 UTC. Main thread only.
 class DriveScenario : public Scenario {
 public:
     // Steps and reports point into the scenario.
@@ -34,6 +34,8 @@ public:
 
     /// When the drive begins by the records' time stamps.
     [[nodiscard]] static Time startTime();
+    /// Seconds from the start to the end of the last step, whose messages `next` returns.
+    [[nodiscard]] double now() const { return _now; }
 
 protected:
     /// A phase of the round starts with a procedure of the scenario `Kind`, where it has one, and lasts
@@ -59,12 +61,10 @@ protected:
     virtual void addReports(DriveScript& due) = 0;
     /// Called before each step, with its time. The default is for technologies without counters.
     virtual void countUntil(double at);
-    /// What is spoilt for the odd message of that number, from 0 on: its kind is allUnusualMessages's element
-    /// `number` modulo their count.
+    /// What is changed for the unusual message of that number, from 0 on: its kind is allUnusualMessages's
+    /// element `number` modulo their count.
     [[nodiscard]] virtual UnusualMessageParts unusualMessageParts(std::size_t number) = 0;
 
-    /// Seconds from the start.
-    [[nodiscard]] double now() const { return _now; }
     [[nodiscard]] ScenarioRandom& random() { return _random; }
     /// The remaining steps of the procedures.
     [[nodiscard]] DriveScript& script() { return _script; }
@@ -88,7 +88,7 @@ private:
     void followTimeline();
     void addUnusualMessage();
     void send(double at, const std::optional<RecordBuilder>& record);
-    /// The offset of that second; never before the last one given.
+    /// The offset of that second; never before the last one returned.
     [[nodiscard]] std::chrono::nanoseconds offsetOf(double at);
 
     std::span<const Phase> _phases;

@@ -8,8 +8,8 @@
 
 namespace velmora {
 
-/// A scenario's pseudo-random numbers: the same seed gives the same numbers on every machine. The engine is
-/// the standard one, whose numbers are fixed; the distributions are our own, since the standard library's
+/// A scenario's pseudo-random numbers: the same seed results in the same numbers on every machine. The engine
+/// is the standard one, whose numbers are fixed; the distributions are our own, since the standard library's
 /// differ from one implementation to the next.
 class ScenarioRandom {
 public:

@@ -12,12 +12,12 @@
 
 namespace velmora {
 
-/// What is odd about a message now and then. Decoders have to cope with all of it.
+/// What is unusual about a message now and then. Decoders have to cope with all of it.
 enum class UnusualMessage : std::uint8_t {
     Truncated,    ///< five bytes of a record: too short to be decoded
     WrongType,    ///< a type byte of 2
     BelowMinimum, ///< a well-framed record that is shorter than its section's least length
-    Prefixed,     ///< a prefix before a good record: odd, but nothing is wrong with it
+    Prefixed,     ///< a prefix before a good record: unusual, but no error
     CountOverrun, ///< a count that exceeds the record's entries
     UnknownCode,  ///< a good record of a code that no decoder wants
 };

@@ -109,7 +109,7 @@ constexpr MemberRow table[] = {
     unused(Of::Location,         "Enabled",             "as Capabilities; disabled sources stay disabled, satellites above all"),
     unused(Of::Location,         "Location",            "empty unless signals are enabled; GetLocation is called instead"),
 
-    // Modem.Signal: levels as ModemManager's own polling gives them.
+    // Modem.Signal: levels as ModemManager's own polling reports them.
     sets  (Of::GSMSignal,        "rssi",                ServingCell, kVoxCellMonitorRSSI,         halfSteps,           "dBm to steps of 2 dBm"),
     sets  (Of::UMTSSignal,       "rscp",                ServingCell, kVoxCellMonitorRSCP,         rscp,                "dBm, to the nearest whole one"),
     sets  (Of::UMTSSignal,       "ecio",                ServingCell, kVoxCellMonitorECN0,         ecno,                "dB, to the nearest whole one"),

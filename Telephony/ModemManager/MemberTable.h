@@ -58,7 +58,7 @@ struct MemberRow {
     std::string_view note;          ///< the units and encodings, or its use, or why it is unused
 };
 
-/// The whole table.
+/// The complete table.
 [[nodiscard]] std::span<const MemberRow> memberTable();
 
 /// Sets every key that has this use, in table order, from the members; a key whose member is missing or out

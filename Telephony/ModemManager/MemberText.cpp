@@ -226,7 +226,7 @@ Value seconds(const Value& member) {
 }
 
 Value bitRate(const Value& member) {
-    // Where it was not negotiated, ModemManager gives 0.
+    // Where it was not negotiated, ModemManager reports 0.
     const std::int64_t* rate = member.asInteger();
     return rate && *rate > 0 ? withUnit(member, " kbit/s", 1000) : Value();
 }

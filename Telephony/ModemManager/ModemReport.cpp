@@ -55,7 +55,7 @@ void addServingLevels(Dictionary& cell, const RadioKind& kind, const Modem& mode
             cell.set(key, value);
 }
 
-/// "MCC,MNC,LAC,CI,TAC" as a dictionary; ModemManager before 1.10 gave no TAC.
+/// "MCC,MNC,LAC,CI,TAC" as a dictionary; ModemManager before 1.10 reported no TAC.
 Dictionary partsOf(std::string_view place) {
     constexpr std::array<std::string_view, 5> names = {"mcc", "mnc", "lac", "ci", "tac"};
     Dictionary parts;

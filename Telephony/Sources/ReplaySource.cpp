@@ -73,7 +73,7 @@ std::optional<ScenarioEvent> ReplaySource::next() {
     reportLosses();
     if (!message) {
         reportEnd();
-        // A round that gave nothing would come again and again without end.
+        // A round without messages would repeat without end.
         if (!_loop || _played == 0 || !rewind())
             return std::nullopt;
         _offset += loopPause;

@@ -42,7 +42,7 @@ inline constexpr std::string_view sourceForms =
 
 /// Parses the command line's source. Options may be in any order, each once. A file's name may hold commas:
 /// what follows its last one that is no option ("loop", "speed=...", "technology=...") belongs to the name.
-/// The reason gives the found and the expected value.
+/// The reason names the found and the expected value.
 Result<SourceChoice> parseSource(std::string_view text);
 
 } // namespace velmora

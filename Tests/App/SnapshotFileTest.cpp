@@ -94,7 +94,7 @@ TEST_F(SnapshotFileTest, OfABinaryFamilyHasTheWholeLogToo) {
     EXPECT_THAT(listed(), ElementsAre("Snapshot (2026-11-16 05:00:02 +0000)", "DLF binary (176 bytes)"));
     save();
     // The record's length (15), its code, eight zeros and the payload close the log; the raw messages of the
-    // display is the whole record.
+    // display are the complete record.
     EXPECT_EQ(python("[type(p['Data'][1]['DLF']).__name__, len(p['Data'][1]['DLF']), "
                      "p['Data'][1]['DLF'][161:].hex(), p['Data'][0]['DisplayState'].hex()]",
                      file(startSeconds + 2)),

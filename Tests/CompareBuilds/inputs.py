@@ -67,7 +67,7 @@ def random_messages(drives: Drives, count: int, directory: Path, seed: int = 1) 
 
 
 def fatal_messages(samples: dict[str, list[bytes]], directory: Path) -> Iterator[Input]:
-    """What ends the program, or decoding, stands in files of its own: nothing after it would be compared."""
+    """What ends the program, or decoding, is in files of its own: nothing after it would be compared."""
     for scenario, technology in TECHNOLOGIES.items():
         own = samples[scenario]
         chance = random.Random(scenario)

@@ -59,7 +59,7 @@ def changed(message: bytes, chance: random.Random) -> bytes:
 
 
 def is_sim_file(message: bytes) -> bool:
-    """An unreadable one ends the program, and that is meant: such stand in files of their own."""
+    """An unreadable one ends the program, and that is meant: such records are in files of their own."""
     at = 2 if message[:1] == b"\x81" else 0
     return message[at : at + 1] == b"\xff" and message[at + 3 : at + 5] in (b"\0\0", b"\0", b"")
 

@@ -24,10 +24,10 @@ protected:
     /// The template's name is that of the resource: "LTE".
     DecoderFixture(std::string_view templateName, std::string_view technology);
 
-    /// Decodes the record; gives the log lines.
+    /// Decodes the record; returns the log lines.
     LogLines update(const Data& record);
     [[nodiscard]] std::string display() { return shown(generator->display(state)); }
-    /// A section's node as `shown` gives it.
+    /// A section's node as `shown` returns it.
     [[nodiscard]] std::string node(std::string_view group, std::string_view section);
 
     FakeClock clock;

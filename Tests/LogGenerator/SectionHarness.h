@@ -38,7 +38,7 @@ public:
     /// The same under another code.
     SectionHarness& update(const Data& record, std::uint32_t logCode);
 
-    /// The node as `shown` gives it.
+    /// The node as `shown` returns it.
     [[nodiscard]] std::string node() const { return shown(value()); }
     /// The text under a label of a dictionary node; "(none)" where there is none.
     [[nodiscard]] std::string text(std::string_view label) const;

@@ -84,7 +84,7 @@ TEST_F(LinuxRemotePortTest, TimeOutsAreHonoured) {
     EXPECT_EQ(port->sendRequest(0, dataOf("b"), 0ms, 5s, true).status, -1);
     EXPECT_TRUE(port->isValid());
 
-    // What is half sent follows whole, what was not begun does not: the stream stays in step.
+    // A frame that is partly sent is completed, one that was not begun is not sent: the next one is readable.
     EXPECT_EQ(receive(_peer, 17 + 16 + (4 << 20)).size(), std::size_t{17 + 16 + (4 << 20)});
     EXPECT_EQ(port->sendRequest(7, dataOf("c"), 5s, 0ms, false).status, 0);
     EXPECT_EQ(receive(_peer, 17), hex("01 00 00 00  07 00 00 00  04 00 00 00  00 00 00 00  63"));

@@ -17,7 +17,7 @@ inline Result<Value> readText(std::string_view text, const PropertyListLimits& l
     return readPropertyList(bytes, limits);
 }
 
-/// A whole document of one value.
+/// A complete document of one value.
 inline std::string plist(const std::string& value) {
     return "<plist version=\"1.0\">" + value + "</plist>";
 }

@@ -41,8 +41,8 @@ inline constexpr ChainDamage everyChainDamage[] = {ChainDamage::None,        Cha
 struct ChainErrors {
     std::size_t damages = 0;
     std::size_t untouched = 0; ///< records that no damage touched
-    std::size_t lost = 0;      ///< of these, the ones that were not given as they were written
-    std::size_t invented = 0;  ///< records given where none was written
+    std::size_t lost = 0;      ///< of these, the ones that were not returned as they were written
+    std::size_t invented = 0;  ///< records returned where none was written
 
     ChainErrors& operator+=(const ChainErrors& other);
     [[nodiscard]] std::size_t errors() const { return lost + invented; }

@@ -19,7 +19,7 @@ namespace velmora {
 struct FakeOutputFile {
     std::vector<std::uint8_t> content;
     std::size_t room = SIZE_MAX; ///< how much the file may hold; a write that finds some room takes it
-    int fullError = ENOSPC;      ///< what a write gives that finds none
+    int fullError = ENOSPC;      ///< the error of a write that finds none
     std::size_t longestWrite = SIZE_MAX;
     int cutError = 0;
     bool isRegular = true;

@@ -62,7 +62,7 @@ private:
     std::size_t _at = 0;
 };
 
-/// What a reader gave until its end.
+/// What a reader returned until its end.
 struct ReadOut {
     std::string technology;
     std::vector<std::string> messages; ///< "1 at 76, 5 ns: 0A0B"

@@ -11,7 +11,7 @@
 
 #include <gtest/gtest.h>
 
-// The error rates that Documentation/record-chain.md gives for RecordChain's weights, held by the recordings
+// The error rates that Documentation/record-chain.md states for RecordChain's weights, held by the recordings
 // of the tests. The bounds are about three times the rates there, since these are fewer damages.
 
 namespace velmora {

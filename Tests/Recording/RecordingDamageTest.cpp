@@ -79,7 +79,7 @@ TEST(RecordingDamage, cutOffWithinItsHeadIsAnEmptyRecording) {
 
 struct DamageCase {
     const char* name;
-    std::size_t offset; ///< where the four bytes stand
+    std::size_t offset; ///< where the four bytes are
     const char* bytes;
     std::vector<std::string> messages;
     std::string loss;

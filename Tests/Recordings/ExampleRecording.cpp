@@ -18,7 +18,7 @@ using namespace std::chrono_literals;
 constexpr auto arrivalDelay = 25ms;
 
 // The excerpts show each procedure of the round, every section that the drive ever fills, and each kind of
-// odd message.
+// unusual message.
 
 constexpr ExampleRecording::Excerpt gsm[] = {
     {0, 13},        // power-on, network search, location update

@@ -15,7 +15,7 @@
 #include <string_view>
 
 // Writes the beginning of a scenario's drive as a recording, stamped with the drive's own time and without
-// waiting for it: so many messages, or with "h" so many hours. The same arguments give the same file; a FILE
+// waiting for it: so many messages, or with "h" so many hours. The same arguments make the same file; a FILE
 // of - is standard output, so that a long drive need not be stored.
 
 namespace velmora {

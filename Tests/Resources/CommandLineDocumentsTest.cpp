@@ -1,6 +1,7 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
+#include "LogGenerator/Fields/Role.h"
 #include "Platform/TelephonyService.h"
 #include "Telephony/Drives/ScenarioRegistry.h"
 #include "Tests/Resources/DissectorSections.h"
@@ -179,13 +180,23 @@ TEST_F(Completion, offersTheValuesOfOptions) {
         for (const auto& [option, values] : help.values)
             EXPECT_EQ(offered("velmora-log " + command + " " + option + " "), values) << command << option;
         if (help.options.contains("--technology")) {
-            EXPECT_EQ(offered("velmora-log " + command + " --technology "), technologies()) << command;
+            Words names = technologies();
+            names.insert({"GSM", "CDMA", "LTE", "UTRAN"});
+            EXPECT_EQ(offered("velmora-log " + command + " --technology "), names) << command;
         }
     }
     for (const std::string program : programs) {
         EXPECT_EQ(offered(program + " --log "), (Words{"syslog", "stderr"}));
         EXPECT_EQ(offered(program + " --log-level="), (Words{"0", "1", "2", "3", "4", "5", "6", "7"}));
     }
+}
+
+TEST_F(Completion, offersRoles) {
+    Words roles = {"serving", "neighbour"};
+    for (const RoleName& row : roleNames())
+        roles.insert(std::string(row.name));
+    EXPECT_EQ(offered("velmora-log fields --role "), roles);
+    EXPECT_EQ(offered("velmora-log fields --role=radio"), Words{"radio.state"});
 }
 
 TEST_F(Completion, offersSources) {
@@ -217,6 +228,7 @@ TEST_F(Completion, offersFiles) {
     EXPECT_EQ(offered("velmora-log info a.dlf " + folder + "g"), gsm);
     EXPECT_EQ(offered("velmora-log record a.pcapng " + folder + "g"), Words{}) << "it takes one file";
     EXPECT_EQ(offered("velmora-log watch " + folder + "g"), Words{}) << "it takes none";
+    EXPECT_EQ(offered("velmora-log fields " + folder + "g"), Words{}) << "it takes none";
     EXPECT_EQ(offered("velmora-log decode --select " + folder + "g"), Words{}) << "no file belongs there";
     EXPECT_EQ(offered("velmora-telephonyd --source replay:" + folder + "gsm.p"), gsm);
     EXPECT_EQ(offered("velmora --sysroot " VELMORA_SOURCE_DIR "/Tests/Recordin"),

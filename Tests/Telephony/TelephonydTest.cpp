@@ -207,7 +207,7 @@ TEST_F(TelephonydTest, badCommandLinesAndInputsHaveDifferentStatus) {
     struct Case {
         Arguments arguments;
         int status;
-        std::string error; ///< the whole of it, or its beginning where it ends in "..."
+        std::string error; ///< all of it, or its beginning where it ends in "..."
     };
     const std::string missing = (directory / "missing").string();
     for (const Case& each : {

@@ -15,6 +15,9 @@ namespace {
 using testing::ElementsAre;
 using testing::HasSubstr;
 
+const std::string technologies =
+    "IFX, GSM (Ostrel_GSM), CDMA (Ostrel_CDMA), LTE (Ostrel_LTE), UTRAN (Ostrel_UTRAN2)";
+
 CommandLine parse(std::vector<const char*> arguments) {
     arguments.insert(arguments.begin(), "velmora-log");
     return parseCommandLine(static_cast<int>(arguments.size()), arguments.data());
@@ -101,6 +104,7 @@ TEST(CommandLineTest, RecordTakesItsLimits) {
     EXPECT_TRUE(record->force);
     EXPECT_EQ(record->duration_seconds, 1.5);
     EXPECT_EQ(record->count, 20U);
+    EXPECT_EQ(record->timeout_seconds, std::nullopt);
 }
 
 TEST(CommandLineTest, ConvertTakesWhatTheNewFileIsToBe) {
@@ -140,14 +144,56 @@ TEST(CommandLineTest, InfoTakesFilesFormatAndTechnology) {
     EXPECT_EQ(plain->format, InfoOptions::Format::Text);
 }
 
+TEST(CommandLineTest, TechnologiesHaveShortFormsInAnyCase) {
+    const std::pair<const char*, const char*> rows[] = {
+        {"LTE", "Ostrel_LTE"},
+        {"lte", "Ostrel_LTE"},
+        {"Gsm", "Ostrel_GSM"},
+        {"UTRAN", "Ostrel_UTRAN2"},
+        {"cdma", "Ostrel_CDMA"},
+        {"ifx", "IFX"},
+        {"ostrel_utran2", "Ostrel_UTRAN2"},
+        {"KVOXLOGCHANNELTECHNOLOGY_OSTREL_LTE", "Ostrel_LTE"},
+        // These are taken as they are.
+        {"Ostrel_LTE", "Ostrel_LTE"},
+        {"kVoxLogChannelTechnology_Ostrel_LTE", "kVoxLogChannelTechnology_Ostrel_LTE"},
+    };
+    for (const auto& [text, technology] : rows) {
+        EXPECT_EQ(std::get<DecodeOptions>(parse({"decode", "a", "--technology", text}).command).technology,
+                  technology);
+        EXPECT_EQ(std::get<InfoOptions>(parse({"info", "a", "--technology", text}).command).technology,
+                  technology);
+        EXPECT_EQ(std::get<ConvertOptions>(parse({"convert", "a", "b.dlf", "--technology", text}).command)
+                      .technology,
+                  technology);
+    }
+}
+
+TEST(CommandLineTest, FieldsTakesATechnologyARoleAndAFormat) {
+    const CommandLine line =
+        parse({"fields", "--technology", "Ostrel_LTE", "--role", "serving", "--format", "csv"});
+    const auto* fields = std::get_if<FieldsOptions>(&line.command);
+    ASSERT_NE(fields, nullptr);
+    EXPECT_EQ(fields->technology, "Ostrel_LTE");
+    EXPECT_TRUE(fields->roles.contains(Role::ServingLevel));
+    EXPECT_FALSE(fields->roles.contains(Role::NeighbourLevel));
+    EXPECT_EQ(fields->format, FieldsOptions::Format::Csv);
+    const CommandLine plainLine = parse({"fields"});
+    const auto* plain = std::get_if<FieldsOptions>(&plainLine.command);
+    ASSERT_NE(plain, nullptr);
+    EXPECT_EQ(plain->technology, "");
+    EXPECT_TRUE(plain->roles.isEverything());
+    EXPECT_EQ(plain->format, FieldsOptions::Format::Text);
+}
+
 TEST(CommandLineTest, UsageErrorsGiveTheFoundAndTheExpectedValue) {
     struct Case {
         std::vector<const char*> arguments;
-        const char* message;
+        std::string message;
     };
     const Case cases[] = {
-        {{}, "no command, wanted decode, watch, record, convert or info"},
-        {{"bogus"}, "got bogus, wanted one of the commands decode, watch, record, convert and info"},
+        {{}, "no command, wanted decode, watch, record, convert, info or fields"},
+        {{"bogus"}, "got bogus, wanted one of the commands decode, watch, record, convert, info and fields"},
         {{"decode"}, "FILE is required"},
         {{"decode", "--format", "xml", "a"}, "--format: got xml, wanted text or json or jsonl or csv"},
         {{"decode", "--every", "day", "a"}, "--every: got day, wanted refresh or message"},
@@ -175,10 +221,25 @@ TEST(CommandLineTest, UsageErrorsGiveTheFoundAndTheExpectedValue) {
         {{"record", "a", "--count", "0"}, "--count: got 0, wanted a number above 0"},
         {{"record", "a", "--duration", "0"}, "--duration: got 0, wanted seconds from 0.001 to 2000000"},
         {{"record", "a", "--duration", "1e99"}, "--duration: got 1e99, wanted seconds from 0.001 to 2000000"},
+        {{"record", "a", "--timeout", "0"}, "--timeout: got 0, wanted seconds from 0.001 to 2000000"},
+        {{"watch", "--once", "--timeout", "x"}, "--timeout: got x, wanted seconds from 0.001 to 2000000"},
+        {{"watch", "--timeout", "1"}, "--timeout requires --once"},
         {{"convert", "a"}, "OUT is required"},
         {{"convert", "a", "-"}, "OUT: got -, wanted a name that ends in .pcapng, .velmora or .dlf"},
+        {{"decode", "--technology", "5G", "a"}, "--technology: got 5G, wanted one of " + technologies},
+        {{"convert", "--technology", "Ostrel_XYZ", "a", "b.dlf"},
+         "--technology: got Ostrel_XYZ, wanted one of " + technologies},
+        {{"info", "--technology", "", "a"}, "--technology: got , wanted one of " + technologies},
         {{"info"}, "FILE is required"},
         {{"info", "--format", "jsonl", "a"}, "--format: got jsonl, wanted text or json"},
+        {{"fields", "a"}, "The following argument was not expected: a"},
+        {{"fields", "--format", "jsonl"}, "--format: got jsonl, wanted text or json or csv"},
+        {{"fields", "--technology", "5G"}, "--technology: got 5G, wanted one of " + technologies},
+        {{"fields", "--role", "level"},
+         "--role: got level, wanted one of serving.mcc, serving.mnc, serving.area, serving.cell, "
+         "serving.channel, serving.physical-cell, serving.level, serving.quality, neighbour.channel, "
+         "neighbour.physical-cell, neighbour.level, neighbour.quality, registration.state, radio.state, "
+         "block-error-rate, data-rate, or the part before a dot"},
         {{"watch", "--log-level", "8"}, "--log-level: got 8, wanted a number from 0 to 7"},
         {{"--log", "file", "watch"}, "--log: got file, wanted syslog or stderr"},
     };
@@ -202,6 +263,7 @@ TEST_F(CommandLineProgramTest, EveryHelpTextShowsAnExampleOnStandardOutput) {
         {{"record", "--help"}, "\n  velmora-log record drive.pcapng\n"},
         {{"convert", "--help"}, "\n  velmora-log record - | velmora-log convert - drive.dlf\n"},
         {{"info", "--help"}, "\n  velmora-log info drive.pcapng\n"},
+        {{"fields", "--help"}, "\n  velmora-log fields --role serving\n"},
     };
     for (const auto& [arguments, example] : cases) {
         ToolProcess process(tool(arguments));

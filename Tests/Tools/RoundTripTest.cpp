@@ -131,8 +131,8 @@ TEST_P(RoundTripTest, RecordingIsTheSameByteForByte) {
 }
 
 TEST_P(RoundTripTest, SnapshotShowsTheLastFiveRefreshes) {
-    // The messages of each refresh. Decoding the messages of the last five again gives what a snapshot can
-    // show.
+    // The messages of each refresh. Decoding the messages of the last five again results in what a snapshot
+    // can show.
     struct Refresh {
         std::vector<Data> messages;
         Time tick;

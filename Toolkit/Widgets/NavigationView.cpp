@@ -68,7 +68,7 @@ void NavigationView::finish() {
     _animation.finish();
 }
 
-/// The upper one of the two travels the whole width, the lower one a third of it.
+/// The upper one of the two travels the entire width, the lower one a third of it.
 void NavigationView::placePane(double part) const {
     const double width = bounds().width;
     const auto put = [](const View* view, double x) {

@@ -10,7 +10,7 @@
 namespace velmora {
 
 bool scrollByTouch(QWidget& widget, const QTouchEvent& event) {
-    // The scroller is fed by hand: a gesture recognizer, which could do it, is never freed.
+    // The scroller gets its input from here: a gesture recognizer, which could do it, is never freed.
     QScroller* const scroller = QScroller::scroller(&widget);
     if (event.points().isEmpty() || event.type() == QEvent::TouchCancel) {
         scroller->stop();

@@ -4,11 +4,12 @@
 #include "Tools/Decode/CSVRows.h"
 
 #include "Tools/Text/CSVText.h"
+#include "Tools/Text/JSONText.h"
 
 namespace velmora {
 
 CSVRows::CSVRows(Output& output, bool isLive, const DecodeOptions& options, const std::string& file)
-    : LineWriter(output, isLive), _options(options) {
+    : LineWriter(output, isLive), _options(options), _ages(options.maximumAge) {
     if (file.empty())
         return;
     TextBuffer cell;
@@ -29,7 +30,7 @@ void CSVRows::didDecode(const LoggedMessage& message, LogGenerator& decoder, Dic
 
 void CSVRows::didRefresh(Time tick, const Decoded& decoded) {
     if (_options.every == DecodeOptions::Every::Refresh)
-        writeRow(tick, decoded.display);
+        writeRow(tick, _ages.fresh(decoded, tick));
     LineWriter::didRefresh(tick, decoded);
 }
 
@@ -38,9 +39,9 @@ std::string CSVRows::header(const DecodeOptions& options) {
     row.append(options.files.size() > 1 ? "time,file" : "time");
     if (options.hasTechnologyColumn)
         row.append(",technology");
-    for (const std::string& path : options.selection.paths()) {
+    for (const std::string& name : options.selection.names()) {
         row.append(',');
-        appendCsvText(row, path);
+        appendCsvText(row, name);
     }
     row.append(csvRowEnd);
     return std::string(row.view());
@@ -52,9 +53,28 @@ void CSVRows::writeRow(Time moment, const Value& display) {
     line().append(_technologyCell);
     for (const std::string& path : _options.selection.paths()) {
         line().append(',');
-        appendCsvCell(line(), NodeSelection::find(display, path));
+        if (NodeSelection::hasWildcard(path))
+            appendAll(display, path);
+        else
+            appendCsvCell(line(), NodeSelection::find(display, path));
     }
     endLine(csvRowEnd);
+}
+
+void CSVRows::appendAll(const Value& display, const std::string& path) {
+    _found.clear();
+    NodeSelection::findAll(display, path, _found);
+    _cell.clear();
+    for (const Value* const value : _found) {
+        if (_cell.size() > 0)
+            _cell.append("; ");
+        if (const std::string* const text = value->asString())
+            _cell.append(*text);
+        else
+            appendJson(_cell, *value);
+    }
+    if (!_found.empty())
+        appendCsvText(line(), _cell.view());
 }
 
 } // namespace velmora

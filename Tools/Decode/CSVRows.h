@@ -3,9 +3,11 @@
 
 #pragma once
 
+#include "Tools/Decode/FreshValues.h"
 #include "Tools/Text/LineWriter.h"
 
 #include <string>
+#include <vector>
 
 namespace velmora {
 
@@ -17,6 +19,7 @@ public:
     [[nodiscard]] bool wantsEveryRefresh() const override {
         return _options.every == DecodeOptions::Every::Refresh;
     }
+    void didMakeDecoder(LogGenerator& decoder) override { _ages.watch(decoder); }
     void willConcern(const Decoded& decoded) override;
     void didDecode(const LoggedMessage& message, LogGenerator& decoder, Dictionary& state) override;
     void didRefresh(Time tick, const Decoded& decoded) override;
@@ -27,10 +30,15 @@ public:
 
 private:
     void writeRow(Time moment, const Value& display);
+    /// The cell of a path with "*": all its values, with "; " between them.
+    void appendAll(const Value& display, const std::string& path);
 
     const DecodeOptions& _options;
     std::string _fileCell;
     std::string _technologyCell;
+    AgeLimit _ages;
+    std::vector<const Value*> _found;
+    TextBuffer _cell;
 };
 
 } // namespace velmora

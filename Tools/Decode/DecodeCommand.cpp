@@ -8,7 +8,12 @@
 #include "Tools/Decode/CSVRows.h"
 #include "Tools/Decode/DecodeProgress.h"
 #include "Tools/Decode/DecodeWriter.h"
+#include "Tools/Decode/FileTechnologies.h"
 #include "Tools/Decode/Jobs/JobScheduler.h"
+#include "Tools/Decode/KnownCatalogues.h"
+#include "Tools/Decode/PathCheck.h"
+#include "Tools/Decode/Samples/SampleRows.h"
+#include "Tools/Decode/Samples/WideRows.h"
 #include "Tools/ExitStatus.h"
 #include "Tools/Log/DecoderLog.h"
 #include "Tools/LogOverride.h"
@@ -19,6 +24,8 @@
 #include <algorithm>
 #include <memory>
 #include <optional>
+#include <string>
+#include <vector>
 
 #include <unistd.h>
 
@@ -70,13 +77,14 @@ bool needsTechnologies(const DecodeOptions& options) {
 
 /// Whether csv needs a column for the technology. Only files that can be read twice are looked at, and they
 /// make it a rule for the others as well.
-bool needsTechnologyColumn(const DecodeOptions& options) {
+bool needsTechnologyColumn(const DecodeOptions& options, FileTechnologies& technologies) {
     return options.format == DecodeOptions::Format::Csv && options.technology.empty() &&
            std::any_of(options.files.begin(), options.files.end(),
-                       [](const std::string& file) { return technologiesOf(file).size() > 1; });
+                       [&](const std::string& file) { return technologies.of(file).size() > 1; });
 }
 
-DecodingRequest requestFor(const std::string& path, const DecodeOptions& options) {
+DecodingRequest requestFor(const std::string& path, const DecodeOptions& options,
+                           FileTechnologies& technologies) {
     using Several = DecodingRequest::Several;
     DecodingRequest request;
     request.technology = options.technology;
@@ -85,23 +93,35 @@ DecodingRequest requestFor(const std::string& path, const DecodeOptions& options
     const bool lacksColumn = options.format == DecodeOptions::Format::Csv && !options.hasTechnologyColumn;
     request.several = lacksColumn && options.technology.empty() ? Several::First : Several::Decode;
     if (needsTechnologies(options))
-        request.technologies = technologiesOf(path);
+        request.technologies = technologies.of(path);
+    if (path == "-")
+        request.checkDecoder = [&options](LogGenerator& decoder) {
+            if (options.selection.paths().empty() || options.files.size() > 1)
+                return; // another file may have it
+            if (const auto problem = impossiblePath(options.selection, {&decoder.catalogue()}))
+                throw ImpossiblePath(*problem);
+        };
     return request;
 }
 
 /// Decodes one file and prints it. Returns whether all of it was read.
-bool decodeFile(std::size_t index, const DecodeOptions& options, bool showsProgress, DecoderLines& lines,
-                Output& output) {
+bool decodeFile(std::size_t index, const DecodeOptions& options, bool showsProgress,
+                FileTechnologies& technologies, SampleColumns& columns, DecoderLines& lines, Output& output) {
     const std::string& path = options.files[index];
     const std::string title = fileTitle(path);
-    DecodingRequest request = requestFor(path, options);
-    const Result<std::unique_ptr<MessageReader>> reader = openMessages(path);
+    DecodingRequest request = requestFor(path, options, technologies);
+    // What has been decoded is written before more is waited for: at the other end a reader may wait for it.
+    std::unique_ptr<DecodeWriter> writer;
+    const Result<std::unique_ptr<MessageReader>> reader = openMessages(path, [&writer] {
+        if (writer)
+            writer->flush();
+    });
     if (!reader) {
         report(title + ": " + reader.reason());
         return false;
     }
     const bool isLive = !inputSize(path);
-    const std::unique_ptr<DecodeWriter> writer = DecodeWriter::make(options, index, isLive, output);
+    writer = DecodeWriter::make(options, index, isLive, columns, output);
     std::optional<ShownProgress> progress;
     if (showsProgress)
         progress.emplace(**reader, path, options);
@@ -115,9 +135,9 @@ bool decodeFile(std::size_t index, const DecodeOptions& options, bool showsProgr
         writer->flush();
         sumUp();
     });
+    request.progress = progress ? progress->get() : nullptr;
     // Over the progress line, which only lines that are written replace.
     const DecoderLog log(lines);
-    request.progress = progress ? progress->get() : nullptr;
     const Result<DecodedFile> decoded = decodeMessages(**reader, request, context, *writer);
     clearProgress();
     if (decoded)
@@ -131,25 +151,52 @@ bool decodeFile(std::size_t index, const DecodeOptions& options, bool showsProgr
     return allDecoded && whole;
 }
 
+std::string headerOf(const DecodeOptions& options, const SampleColumns& columns) {
+    switch (options.samples) {
+    case DecodeOptions::Samples::None: break;
+    case DecodeOptions::Samples::Long: return SampleRows::header(options);
+    case DecodeOptions::Samples::Wide:
+        return columns.columns().empty() ? std::string() : WideRows::header(options, columns);
+    }
+    return CSVRows::header(options);
+}
+
 } // namespace
 
 int runDecode(const DecodeOptions& given, DecoderLines& lines, Output& output) {
     DecodeOptions options = given;
-    options.hasTechnologyColumn = needsTechnologyColumn(options);
+    FileTechnologies technologies;
+    options.hasTechnologyColumn = needsTechnologyColumn(options, technologies);
+    const KnownCatalogues known(options, technologies);
+    const auto problem =
+        known.areAll() ? impossiblePath(options.selection, known.catalogues()) : std::nullopt;
+    if (problem) {
+        report("--select: " + *problem);
+        return ExitStatus::Usage;
+    }
+    SampleColumns columns;
+    for (const Catalogue* const catalogue : known.catalogues())
+        columns.add(options.selection, *catalogue);
     if (options.format == DecodeOptions::Format::Csv)
-        output.put(CSVRows::header(options));
+        output.put(headerOf(options, columns));
     // Standard input that is named twice is read by one process: the second reader gets what is left.
     const std::ptrdiff_t standardInputs = std::count(options.files.begin(), options.files.end(), "-");
-    const std::size_t jobs = standardInputs > 1 ? 1 : std::min(options.jobs, options.files.size());
+    const std::size_t jobs =
+        standardInputs > 1 || !known.areAll() ? 1 : std::min(options.jobs, options.files.size());
     bool good = true;
     if (jobs > 1) {
         const Job job = [&](std::size_t index, Output& part) {
-            return decodeFile(index, options, false, lines, part);
+            return decodeFile(index, options, false, technologies, columns, lines, part);
         };
         good = JobScheduler(options.files.size(), jobs, job, output).run();
     } else {
-        for (std::size_t index = 0; index < options.files.size() && output.isOpen(); ++index)
-            good = decodeFile(index, options, true, lines, output) && good;
+        try {
+            for (std::size_t index = 0; index < options.files.size() && output.isOpen(); ++index)
+                good = decodeFile(index, options, true, technologies, columns, lines, output) && good;
+        } catch (const ImpossiblePath& impossible) {
+            report(std::string("--select: ") + impossible.what());
+            return ExitStatus::Usage;
+        }
     }
     output.flush();
     return good && output.state() != Output::State::Failed ? ExitStatus::Done : ExitStatus::BadInput;

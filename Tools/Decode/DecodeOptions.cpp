@@ -17,13 +17,27 @@ void checkTogether(const DecodeOptions& options) {
     const bool everyMessage = options.every == DecodeOptions::Every::Message;
     if (options.messages.isWarm && !options.messages.range.from)
         throw CLI::ValidationError("--warm", "got no --from, wanted the time from which on to write");
+    if (options.maximumAge && (everyMessage || options.samples != DecodeOptions::Samples::None ||
+                               (options.format != Format::JsonLines && options.format != Format::Csv)))
+        throw CLI::ValidationError("--max-age",
+                                   "got another output, wanted --every refresh with --format jsonl "
+                                   "or csv");
+    if (options.samples != DecodeOptions::Samples::None) {
+        const bool isWide = options.samples == DecodeOptions::Samples::Wide;
+        if (isWide && options.format != Format::Csv)
+            throw CLI::ValidationError("--wide", "got another format, wanted --format csv");
+        if (isWide && !hasSelection)
+            throw CLI::ValidationError("--wide", "got no --select, wanted one for each column");
+        if (options.format != Format::JsonLines && options.format != Format::Csv)
+            throw CLI::ValidationError("--samples", "got another format, wanted --format jsonl or csv");
+        if (everyMessage)
+            throw CLI::ValidationError("--samples", "got --every message too, wanted one of the two");
+        return;
+    }
     if (options.format == Format::Csv && !hasSelection)
         throw CLI::ValidationError("--format csv", "got no --select, wanted one for each column");
     if (everyMessage && options.format != Format::JsonLines && options.format != Format::Csv)
         throw CLI::ValidationError("--every message", "got another format, wanted --format jsonl or csv");
-    if (everyMessage && options.format == Format::JsonLines && hasSelection)
-        throw CLI::ValidationError(
-            "--every message", "got --select with --format jsonl, wanted it with --format csv or not at all");
 }
 
 } // namespace
@@ -57,6 +71,29 @@ CLI::App* addDecode(CLI::App& app, DecodeOptions& options) {
             "row; the default is refresh")
         ->check(oneOf({"refresh", "message"}))
         ->type_name("refresh|message");
+    using Samples = DecodeOptions::Samples;
+    CLI::Option* const samples = command->add_flag_callback(
+        "--samples",
+        [&options] { options.samples = options.samples == Samples::Wide ? Samples::Wide : Samples::Long; },
+        "jsonl and csv have a line for each value that a message reported, in the catalogue's unit and sign "
+        "(velmora-log fields), instead of the display");
+    command
+        ->add_flag_callback(
+            "--wide", [&options] { options.samples = Samples::Wide; },
+            "With --samples and csv: a row for each message that reported a selected value, a column for "
+            "each selected leaf, a row of its own for each row of a list")
+        ->needs(samples);
+    command
+        ->add_option_function<double>(
+            "--max-age",
+            [&options](double seconds) {
+                options.maximumAge = std::chrono::duration_cast<std::chrono::nanoseconds>(
+                    std::chrono::duration<double>(seconds));
+            },
+            "At each refresh, leave out values that were reported longer ago: a display keeps what it shows "
+            "until something else replaces it")
+        ->check(CLI::Range(0.0, 1e9))
+        ->type_name("SECONDS");
     command
         ->add_option_function<std::vector<std::string>>(
             "--select",

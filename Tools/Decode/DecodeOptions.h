@@ -6,7 +6,9 @@
 #include "Tools/Decode/NodeSelection.h"
 #include "Tools/Messages/MessageSelection.h"
 
+#include <chrono>
 #include <cstddef>
+#include <optional>
 #include <string>
 #include <vector>
 
@@ -28,7 +30,12 @@ struct DecodeOptions {
 
     Format format = Format::Text;
     Every every = Every::Refresh; ///< `Message` for JsonLines and Csv alone
-    NodeSelection selection;      ///< not empty for Csv; empty for JsonLines with `Message`
+    /// Observations instead of the display: none, a line for each value (JsonLines and Csv), or a row for
+    /// each message (Csv).
+    enum class Samples { None, Long, Wide } samples = Samples::None;
+    NodeSelection selection; ///< not empty for Csv without or with wide samples
+    /// For JsonLines and Csv at each refresh: older values are left out. Absent for no limit.
+    std::optional<std::chrono::nanoseconds> maximumAge;
     MessageSelection messages;
     std::string technology; ///< overrides the file's, or chooses one of several; empty for the file's
     bool isStrict = false;  ///< a message that ends the application ends decoding as well

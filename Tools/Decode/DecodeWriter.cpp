@@ -6,6 +6,9 @@
 #include "Tools/Decode/CSVRows.h"
 #include "Tools/Decode/FinalDisplay.h"
 #include "Tools/Decode/JSONLines.h"
+#include "Tools/Decode/Samples/SampleLines.h"
+#include "Tools/Decode/Samples/SampleRows.h"
+#include "Tools/Decode/Samples/WideRows.h"
 #include "Tools/Output.h"
 #include "Tools/Report.h"
 #include "Tools/Text/PrintableText.h"
@@ -15,14 +18,20 @@
 namespace velmora {
 
 std::unique_ptr<DecodeWriter> DecodeWriter::make(const DecodeOptions& options, std::size_t index, bool isLive,
-                                                 Output& output) {
+                                                 SampleColumns& columns, Output& output) {
     using Format = DecodeOptions::Format;
     const std::string named = options.files.size() > 1 ? options.files[index] : std::string();
+    if (options.samples == DecodeOptions::Samples::Wide)
+        return std::make_unique<WideRows>(output, isLive, options, named, columns);
+    if (options.samples == DecodeOptions::Samples::Long && options.format == Format::Csv)
+        return std::make_unique<SampleRows>(output, isLive, options, named);
+    if (options.samples == DecodeOptions::Samples::Long)
+        return std::make_unique<SampleLines>(output, isLive, options, named);
     switch (options.format) {
     case Format::JsonLines:
         if (options.every == DecodeOptions::Every::Message)
-            return std::make_unique<MessageLines>(output, isLive, named);
-        return std::make_unique<RefreshLines>(output, isLive, options.selection, named);
+            return std::make_unique<MessageLines>(output, isLive, options.selection, named);
+        return std::make_unique<RefreshLines>(output, isLive, options, named);
     case Format::Csv: return std::make_unique<CSVRows>(output, isLive, options, named);
     case Format::Text:
     case Format::Json: break;

@@ -12,14 +12,17 @@
 namespace velmora {
 
 class Output;
+class SampleColumns;
 
 /// What `decode` prints of a file, in one of its formats: during decoding or at its end.
 class DecodeWriter : public DecodingObserver {
 public:
     /// The writer of the options' format for the file of that index. `isLive`: more may still be written to
-    /// the file, as to a pipe. `options` and `output` must outlive it.
+    /// the file, as to a pipe. `columns`: those of wide samples. `options`, `columns` and `output` must
+    /// outlive it.
     [[nodiscard]] static std::unique_ptr<DecodeWriter> make(const DecodeOptions& options, std::size_t index,
-                                                            bool isLive, Output& output);
+                                                            bool isLive, SampleColumns& columns,
+                                                            Output& output);
 
     /// The file has been decoded to its end; called for each of its technologies.
     virtual void finish(const Decoded&) {}

@@ -13,6 +13,7 @@
 #include "Tools/Messages/MessageSelection.h"
 
 #include <cstdint>
+#include <functional>
 #include <string>
 #include <vector>
 
@@ -42,6 +43,8 @@ class DecodingObserver {
 public:
     virtual ~DecodingObserver() = default;
 
+    /// The decoder of a technology is there; called before anything of that technology is decoded.
+    virtual void didMakeDecoder(LogGenerator& /*decoder*/) {}
     /// The calls that follow, up to the next of this kind, concern this technology. Called at the first of
     /// them, where another technology follows, and again where the file turns out to hold several.
     virtual void willConcern(const Decoded& /*decoded*/) {}
@@ -79,6 +82,8 @@ struct DecodingRequest {
     DecodeProgress* progress = nullptr; ///< gets the offset of every message, selected or not; may be null
     /// A message that ends the application ends the program here as well.
     bool isStrict = false;
+    /// Called for the decoder of each technology, before it decodes anything; what it raises passes through.
+    std::function<void(LogGenerator&)> checkDecoder = {};
     Several several = Several::Decode;
     /// Those of the whole file, where they have been found out beforehand (technologiesOf); without, those
     /// count that the file names before its first message, and further ones as they come.

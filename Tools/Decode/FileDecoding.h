@@ -20,7 +20,8 @@ public:
     FileDecoding(MessageReader& reader, const DecodingRequest& request, WorkContext& context,
                  DecodingObserver& observer)
         : _reader(reader), _request(request),
-          _context(context), _shared{observer, MessageFilter(request.messages), request.isStrict,
+          _context(context), _shared{observer,           MessageFilter(request.messages),
+                                     request.isStrict,   request.checkDecoder,
                                      observer.effects(), observer.wantsEveryRefresh()} {}
 
     Result<DecodedFile> run();

@@ -5,6 +5,7 @@
 
 #include "Tools/Text/JSONText.h"
 
+#include <algorithm>
 #include <string>
 
 namespace velmora {
@@ -33,11 +34,22 @@ void appendDisplay(TextBuffer& line, const Value& display) {
         appendJson(line, display);
 }
 
+/// Where a value that has no section is shown: a list's node for its entries.
+template <class Places>
+void addValue(Places& places, const CatalogueSource& source, const CatalogueNode& leaf) {
+    const bool isEntry = source.list && leaf.isRow();
+    const std::string_view key = isEntry ? source.list->label : source.field->label;
+    const CatalogueNode* const node = isEntry ? leaf.parent() : &leaf;
+    auto& nodes = places[std::string(key)];
+    if (std::find(nodes.begin(), nodes.end(), node) == nodes.end())
+        nodes.push_back(node);
+}
+
 } // namespace
 
-RefreshLines::RefreshLines(Output& output, bool isLive, const NodeSelection& selection,
-                           const std::string& file)
-    : LineWriter(output, isLive), _selection(selection), _begin(beginOf(file)) {}
+RefreshLines::RefreshLines(Output& output, bool isLive, const DecodeOptions& options, const std::string& file)
+    : LineWriter(output, isLive), _selection(options.selection), _ages(options.maximumAge),
+      _begin(beginOf(file)) {}
 
 void RefreshLines::didRefresh(Time tick, const Decoded& decoded) {
     line().append(_begin);
@@ -46,21 +58,42 @@ void RefreshLines::didRefresh(Time tick, const Decoded& decoded) {
     appendJsonString(line(), decoded.technology);
     line().append(",\"messages\":");
     line().append(std::to_string(decoded.messages));
-    appendDisplay(line(), _selection.restricted(decoded.display));
+    appendDisplay(line(), _selection.restricted(_ages.fresh(decoded, tick)));
     endLine("}\n");
     LineWriter::didRefresh(tick, decoded);
 }
 
-MessageLines::MessageLines(Output& output, bool isLive, const std::string& file)
-    : LineWriter(output, isLive), _begin(beginOf(file)) {}
+MessageLines::MessageLines(Output& output, bool isLive, const NodeSelection& selection,
+                           const std::string& file)
+    : LineWriter(output, isLive), _selection(selection), _begin(beginOf(file)) {}
+
+void MessageLines::didMakeDecoder(LogGenerator& decoder) {
+    if (_selection.paths().empty())
+        return;
+    const Catalogue& catalogue = decoder.catalogue();
+    Places& places = _places[catalogue.technology()];
+    for (const CatalogueField& leaf : catalogue.fields()) {
+        for (const CatalogueNode* node = leaf.node; node && !leaf.section.empty(); node = node->parent())
+            if (node->name() == leaf.section)
+                places[leaf.section].assign(1, node);
+        if (leaf.section.empty())
+            for (const CatalogueSource& source : leaf.sources)
+                addValue(places, source, *leaf.node);
+    }
+}
 
 void MessageLines::willConcern(const Decoded& decoded) {
+    const auto places = _places.find(decoded.technology);
+    _current = places == _places.end() ? nullptr : &places->second;
     if (decoded.isOneOfSeveral)
         _technology = "\",\"technology\":\"" + decoded.technology;
 }
 
 void MessageLines::didDecode(const LoggedMessage&, LogGenerator&, Dictionary&) {
-    endLine(_end);
+    if (_current && _first)
+        dropLine();
+    else
+        endLine(_end);
 }
 
 void MessageLines::sections(std::optional<std::uint32_t> code) {
@@ -78,7 +111,9 @@ void MessageLines::values(std::optional<std::uint32_t> code) {
 void MessageLines::display(const Value& display) {
     begin();
     line().append('"');
-    appendDisplay(line(), display);
+    const Value selected = _selection.restricted(display);
+    appendDisplay(line(), selected);
+    _first = selected.isNone();
     _end = "}\n";
 }
 
@@ -105,6 +140,21 @@ void MessageLines::member(std::string_view name, const Value& value) {
     appendJsonString(line(), name);
     line().append(':');
     appendJson(line(), value);
+}
+
+void MessageLines::selectedMember(std::string_view name, const Value& value) {
+    if (!_current) {
+        member(name, value);
+        return;
+    }
+    const auto places = _current->find(name);
+    if (places == _current->end())
+        return;
+    for (const CatalogueNode* const place : places->second)
+        if (const Value part = _selection.restrictedAt(*place, value); !part.isNone()) {
+            member(name, part);
+            return; // a value that is shown twice is one value
+        }
 }
 
 } // namespace velmora

@@ -3,9 +3,13 @@
 
 #pragma once
 
+#include "Tools/Decode/FreshValues.h"
 #include "Tools/Text/LineWriter.h"
 
+#include <functional>
+#include <map>
 #include <string>
+#include <vector>
 
 namespace velmora {
 
@@ -13,20 +17,24 @@ namespace velmora {
 /// selected part of the display. The file's name goes in front where it is not empty.
 class RefreshLines final : public LineWriter {
 public:
-    RefreshLines(Output& output, bool isLive, const NodeSelection& selection, const std::string& file);
+    RefreshLines(Output& output, bool isLive, const DecodeOptions& options, const std::string& file);
+    void didMakeDecoder(LogGenerator& decoder) override { _ages.watch(decoder); }
     void didRefresh(Time tick, const Decoded& decoded) override;
 
 private:
     const NodeSelection& _selection;
+    AgeLimit _ages;
     std::string _begin;
 };
 
 /// One JSON object a line for each message: its time, its code (null for a message that was dropped), and
 /// what it concerned: "sections", "values" or, without a code, "display". The technology follows the time
-/// where the file holds several.
+/// where the file holds several. With a selection, only what of it is selected, and no line for a message
+/// that concerned nothing of that.
 class MessageLines final : public LineWriter, private MessageEffects {
 public:
-    MessageLines(Output& output, bool isLive, const std::string& file);
+    MessageLines(Output& output, bool isLive, const NodeSelection& selection, const std::string& file);
+    void didMakeDecoder(LogGenerator& decoder) override;
     void willConcern(const Decoded& decoded) override;
     void willDecode(const LoggedMessage& message) override { _moment = message.time; }
     [[nodiscard]] MessageEffects* effects() override { return this; }
@@ -35,15 +43,23 @@ public:
 
 private:
     void sections(std::optional<std::uint32_t> code) override;
-    void section(std::string_view name, const Value& node) override { member(name, node); }
+    void section(std::string_view name, const Value& node) override { selectedMember(name, node); }
     void values(std::optional<std::uint32_t> code) override;
-    void value(std::string_view key, const Value& value) override { member(key, value); }
+    void value(std::string_view key, const Value& value) override { selectedMember(key, value); }
     void display(const Value& display) override;
 
     void begin();
     void appendCode(std::optional<std::uint32_t> code);
     void member(std::string_view name, const Value& value);
+    /// What of a section or value is selected, if anything is.
+    void selectedMember(std::string_view name, const Value& value);
 
+    /// Where sections and values are in the displays of a technology, by their names.
+    using Places = std::map<std::string, std::vector<const CatalogueNode*>, std::less<>>;
+
+    const NodeSelection& _selection;
+    std::map<std::string, Places, std::less<>> _places; ///< by technology; with a selection only
+    const Places* _current = nullptr;
     std::string _begin;
     std::string _technology; ///< the member, from the quote after the time on to that before the next comma
     Time _moment{};

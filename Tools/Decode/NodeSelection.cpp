@@ -3,6 +3,7 @@
 
 #include "Tools/Decode/NodeSelection.h"
 
+#include "LogGenerator/Observations/PathPattern.h"
 #include "Model/NodePath.h"
 
 #include <algorithm>
@@ -17,20 +18,6 @@ namespace {
 /// root's own path adds nothing in front when paths are joined.
 using Rests = std::vector<std::string_view>;
 
-/// What is left after a child of that name, empty for the child itself; none where the path does not lead to
-/// it. The reverse of appendingPathComponent.
-std::optional<std::string_view> after(std::string_view rest, bool atRoot, std::string_view name) {
-    const std::string_view slashes = atRoot && name.empty() ? "//" : "/";
-    if (!rest.starts_with(slashes))
-        return std::nullopt;
-    rest.remove_prefix(slashes.size());
-    // A slash in the name looks like one between names.
-    if (!rest.starts_with(name))
-        return std::nullopt;
-    rest.remove_prefix(name.size());
-    return rest.empty() || rest.front() == '/' ? std::optional(rest) : std::nullopt;
-}
-
 std::string_view nameOf(std::string_view key, bool isSorted) {
     return isSorted ? nameOfSortedKey(key) : key;
 }
@@ -44,7 +31,7 @@ const Value* findIn(const Dictionary& dictionary, std::string_view rest, bool at
     for (const auto& [key, child] : dictionary) {
         if (key == sortedMarker || child.isNone())
             continue;
-        const std::optional<std::string_view> left = after(rest, atRoot, nameOf(key, isSorted));
+        const std::optional<std::string_view> left = PathPattern::after(rest, atRoot, nameOf(key, isSorted));
         // The later row: in a sorted dictionary the one of the greater key.
         if (!left || (isSorted && foundKey && key < *foundKey))
             continue;
@@ -63,7 +50,7 @@ const Value* findIn(const Array& array, std::string_view rest, bool atRoot) {
     if (error != std::errc() || end != number.data() + number.size() || index >= array.size())
         return nullptr;
     // Only the number as the tree writes it: "0", not "00".
-    const std::optional<std::string_view> left = after(rest, atRoot, std::to_string(index));
+    const std::optional<std::string_view> left = PathPattern::after(rest, atRoot, std::to_string(index));
     if (!left)
         return nullptr;
     return left->empty() ? &array[index] : findAfter(array[index], *left, false);
@@ -87,7 +74,7 @@ struct Share {
 Share shareOf(const Rests& rests, bool atRoot, std::string_view name) {
     Share share;
     for (const std::string_view rest : rests)
-        if (const std::optional<std::string_view> left = after(rest, atRoot, name)) {
+        if (const std::optional<std::string_view> left = PathPattern::after(rest, atRoot, name)) {
             if (left->empty())
                 share.isSelected = true;
             else
@@ -152,7 +139,50 @@ NodeRef restrictedAfter(const VelmoraModelNode& node, const Rests& rests, bool a
     return std::make_shared<VelmoraModelTreeNode>(node.displayName(), std::move(children));
 }
 
+void findAllAfter(const Value& value, std::string_view rest, bool atRoot, std::vector<const Value*>& found) {
+    const auto look = [&](std::string_view name, const Value& child) {
+        const std::optional<std::string_view> left = PathPattern::after(rest, atRoot, name);
+        if (left && left->empty())
+            found.push_back(&child);
+        else if (left)
+            findAllAfter(child, *left, false, found);
+    };
+    if (const Dictionary* const dictionary = value.asDictionary()) {
+        const bool isSorted = dictionary->contains(sortedMarker);
+        for (const auto& [key, child] : *dictionary)
+            if (key != sortedMarker && !child.isNone())
+                look(nameOf(key, isSorted), child);
+    } else if (const Array* const array = value.asArray()) {
+        for (std::size_t i = 0; i < array->size(); ++i)
+            look(std::to_string(i), (*array)[i]);
+    }
+}
+
 } // namespace
+
+NodeSelection::NodeSelection(const std::vector<std::string>& texts) {
+    for (const std::string& text : texts) {
+        const std::size_t name = text.starts_with('/') ? 0 : text.find("=/");
+        _paths.push_back(name == 0 ? text : text.substr(name + 1));
+        _names.push_back(name == 0 ? text : text.substr(0, name));
+    }
+}
+
+bool NodeSelection::isPath(std::string_view text) {
+    const std::size_t path = text.find("=/");
+    return text.starts_with('/') || (path != std::string_view::npos && path != 0);
+}
+
+void NodeSelection::findAll(const Value& display, std::string_view path, std::vector<const Value*>& found) {
+    findAllAfter(display, path, true, found);
+}
+
+bool NodeSelection::hasWildcard(std::string_view path) {
+    for (std::size_t at = path.find("/*"); at != std::string_view::npos; at = path.find("/*", at + 1))
+        if (at + 2 == path.size() || path[at + 2] == '/')
+            return true;
+    return false;
+}
 
 const Value* NodeSelection::find(const Value& display, std::string_view path) {
     if (display.isNone())
@@ -162,6 +192,20 @@ const Value* NodeSelection::find(const Value& display, std::string_view path) {
 
 Value NodeSelection::restricted(const Value& display) const {
     return selectsAll() ? display : restrictedAfter(display, Rests(_paths.begin(), _paths.end()), true);
+}
+
+Value NodeSelection::restrictedAt(const CatalogueNode& place, const Value& value) const {
+    if (selectsAll())
+        return value;
+    Rests inside;
+    for (const std::string& each : _paths) {
+        const std::optional<std::string_view> left = PathPattern::below(each, place);
+        if (left && left->empty())
+            return value;
+        if (left)
+            inside.push_back(*left);
+    }
+    return inside.empty() ? Value() : restrictedAfter(value, inside, false);
 }
 
 NodeRef NodeSelection::restricted(const NodeRef& root) const {

@@ -3,6 +3,7 @@
 
 #pragma once
 
+#include "LogGenerator/Observations/Catalogue.h"
 #include "Model/VelmoraModelNode.h"
 #include "PropertyLists/Value.h"
 
@@ -14,22 +15,31 @@
 namespace velmora {
 
 /// The parts of a display that a user has selected by the paths of the display tree ("/Serving Cell/ARFCN",
-/// "/Neighboring Cells/0"). Works on the display dictionary itself, since building the tree would cost more
-/// than all else. Where several rows share a path, `find` returns the last; the restricted displays keep them
-/// all.
+/// "/Neighboring Cells/0", "/Neighboring Cells/*/ARFCN"; see PathPattern). Works on the display dictionary
+/// itself, since building the tree would cost more than all else. Where several rows share a path, `find`
+/// returns the last; the restricted displays keep them all.
 class NodeSelection {
 public:
-    /// Precondition: each path is one that `isPath`. Without paths everything is selected.
-    explicit NodeSelection(std::vector<std::string> paths) : _paths(std::move(paths)) {}
+    /// Precondition: each of the texts is one that `isPath`. Without paths everything is selected.
+    explicit NodeSelection(const std::vector<std::string>& texts);
     NodeSelection() = default;
 
-    /// Whether the text may be a path: it begins with a slash.
-    [[nodiscard]] static bool isPath(std::string_view text) { return text.starts_with('/'); }
+    /// Whether the text may be a path, which begins with a slash, or a name, "=" and a path.
+    [[nodiscard]] static bool isPath(std::string_view text);
 
     [[nodiscard]] const std::vector<std::string>& paths() const { return _paths; }
+    /// What a column of each path is called: its name, or the path itself.
+    [[nodiscard]] const std::vector<std::string>& names() const { return _names; }
+
+    /// The same of a part of a display: the value of that place.
+    [[nodiscard]] Value restrictedAt(const CatalogueNode& place, const Value& value) const;
 
     /// The value of the node at the path; null where there is none. Belongs to the display.
     [[nodiscard]] static const Value* find(const Value& display, std::string_view path);
+    /// The values of all nodes at a path with "*", in the display's order.
+    static void findAll(const Value& display, std::string_view path, std::vector<const Value*>& found);
+    /// Whether the path may be that of several nodes.
+    [[nodiscard]] static bool hasWildcard(std::string_view path);
 
     /// The display reduced to the selected nodes and what leads to them: their keys, "_sorted" markers, and,
     /// before a selected element of an array, none for each element that is not selected. None where nothing
@@ -42,6 +52,7 @@ private:
     [[nodiscard]] bool selectsAll() const;
 
     std::vector<std::string> _paths;
+    std::vector<std::string> _names;
 };
 
 } // namespace velmora

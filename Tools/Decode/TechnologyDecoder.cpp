@@ -19,6 +19,9 @@ Result<std::unique_ptr<TechnologyDecoder>> TechnologyDecoder::make(const std::st
     if (!decoder)
         return Failure{decoder.reason()};
     made->_decoder = *std::move(decoder);
+    if (shared.checkDecoder)
+        shared.checkDecoder(*made->_decoder);
+    shared.observer.didMakeDecoder(*made->_decoder);
     made->_keepsHistory = shared.observer.wantsHistory(0);
     made->_decoder->setKeepsHistory(made->_keepsHistory);
     return made;

@@ -10,6 +10,7 @@
 #include "Tools/Decode/Refreshes.h"
 #include "Tools/Messages/MessageSelection.h"
 
+#include <functional>
 #include <memory>
 #include <optional>
 #include <string>
@@ -23,6 +24,7 @@ struct SharedDecoding {
     DecodingObserver& observer;
     MessageFilter filter;
     bool isStrict;
+    std::function<void(LogGenerator&)> checkDecoder;
     MessageEffects* effects;
     bool wantsEveryRefresh;
     /// The one that the observer's next calls concern, as it has been told; null after a change.

@@ -26,8 +26,11 @@ public:
 
     /// What is wrong with the connection, as far as the log has said; empty while nothing is.
     [[nodiscard]] const std::string& problem() const { return _problem; }
-    /// A reason that has been found otherwise than by the log.
-    void setProblem(const std::string& problem);
+    /// The cause of this attempt's failure, which has been found otherwise than by the log.
+    void setCause(const std::string& problem) {
+        setProblem(problem);
+        _attemptFailed = false;
+    }
     /// The connection is good now.
     void clearProblem() {
         _problem.clear();
@@ -35,6 +38,8 @@ public:
     }
 
 private:
+    void setProblem(const std::string& problem);
+
     DecoderLines& _lines;
     std::function<void(const std::string& problem)> _changed;
     std::string _problem;

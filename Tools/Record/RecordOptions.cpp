@@ -7,31 +7,24 @@
 
 namespace velmora {
 
-namespace {
-
-/// At most what the event loop's timers hold, which is 24 days.
-CLI::Validator validSeconds() {
-    return validator(
-        [](const std::string& text) {
-            double seconds = 0;
-            return CLI::detail::lexical_cast(text, seconds) && seconds >= 0.001 && seconds <= 2e6;
-        },
-        "seconds from 0.001 to 2000000");
-}
-
-} // namespace
-
 CLI::App* addRecord(CLI::App& app, RecordOptions& options) {
     CLI::App* command =
         app.add_subcommand("record", "Record the telephony service's messages until interrupted");
     command->add_option("FILE", options.file, "Where to; - is standard output")->required()->type_name("");
     command->add_flag("--force", options.force, "Overwrite FILE if it exists");
     command->add_option("--duration", options.duration_seconds, "Stop this long after the start")
-        ->check(validSeconds())
+        ->check(positiveSeconds())
         ->type_name("SECONDS");
     command->add_option("--count", options.count, "Stop after this many messages")
         ->check(positiveCount())
         ->type_name("N");
+    command
+        ->add_option(
+            "--timeout", options.timeout_seconds,
+            "End with status 1 if no telephony service has answered after this time; the default is to "
+            "wait")
+        ->check(positiveSeconds())
+        ->type_name("SECONDS");
     command->footer(
         "Messages are written, and their sync to storage started, within half a second. A failed write\n"
         "and a lost service are reported immediately; up to 32 MiB of messages are queued, and recording\n"

@@ -18,7 +18,8 @@ struct RecordOptions {
     std::string file;   ///< "-" for standard output
     bool force = false; ///< overwrite an existing file
     std::optional<double> duration_seconds;
-    std::optional<std::uint64_t> count; ///< messages
+    std::optional<std::uint64_t> count;    ///< messages
+    std::optional<double> timeout_seconds; ///< how long to wait for a service at the start
 };
 
 /// Adds the command with its options, help and examples. Parsing fills `options`, which must outlive `app`.

@@ -26,6 +26,10 @@ constexpr auto saveInterval = 500ms;
 /// How often writing is retried while the file cannot be written, and the progress is shown.
 constexpr auto progressInterval = 1s;
 
+std::chrono::nanoseconds nanosecondsOf(double seconds) {
+    return std::chrono::nanoseconds(static_cast<std::int64_t>(std::llround(seconds * 1e9)));
+}
+
 } // namespace
 
 Recorder::Recorder(const RecordOptions& options, RecordingSession& session, DecoderLines& lines,
@@ -48,9 +52,9 @@ int Recorder::run() {
     const SignalWatcher signals([this](int) { end(ExitStatus::Done); });
     _client.queue.async([model = _model] { model->restartMonitor(); });
     if (_options.duration_seconds)
-        _client.queue.after(std::chrono::nanoseconds(
-                                static_cast<std::int64_t>(std::llround(*_options.duration_seconds * 1e9))),
-                            [this] { end(ExitStatus::Done); });
+        _client.queue.after(nanosecondsOf(*_options.duration_seconds), [this] { end(ExitStatus::Done); });
+    if (_options.timeout_seconds)
+        _client.queue.after(nanosecondsOf(*_options.timeout_seconds), [this] { giveUp(); });
     const std::unique_ptr<Timer> saving = _client.queue.repeating(saveInterval, [this] { save(); });
     const std::unique_ptr<Timer> retrying = _client.queue.repeating(progressInterval, [this] { retry(); });
     showProgress();
@@ -85,6 +89,19 @@ void Recorder::take(const Data& message) {
     if (check(_session.append(_client.clock.now(), message.bytes())) && _options.count &&
         _session.messages() >= *_options.count)
         end(ExitStatus::Done);
+    else if (_session.isLive())
+        saveSoon();
+}
+
+/// Once the messages that have arrived are taken: those that come in a row are written together.
+void Recorder::saveSoon() {
+    if (std::exchange(_savesSoon, true))
+        return;
+    _client.queue.async([this] {
+        _savesSoon = false;
+        if (!_ended && _session.temporaryError().empty())
+            static_cast<void>(check(_session.save()));
+    });
 }
 
 void Recorder::save() {
@@ -122,6 +139,14 @@ void Recorder::serviceIsGone() {
 void Recorder::reportProblem(const std::string& problem) {
     if (!_ended && _session.technology().empty())
         _news.inform(problem + "; retrying");
+}
+
+/// The service has had its time to name a technology.
+void Recorder::giveUp() {
+    if (_ended || !_session.technology().empty())
+        return;
+    _news.inform("nothing was recorded: " + timeoutMessage(_log.problem(), *_options.timeout_seconds));
+    end(ExitStatus::BadInput);
 }
 
 /// Ends the recording on a failure, after reporting it. Returns whether there was none.

@@ -31,9 +31,11 @@ private:
     bool learn(std::string_view technology, bool hasDecoder);
     void take(const Data& message);
     void save();
+    void saveSoon();
     void retry();
     void checkService();
     void serviceIsGone();
+    void giveUp();
     void reportProblem(const std::string& problem);
     bool check(const Result<Done>& result);
     void showProgress();
@@ -48,6 +50,7 @@ private:
     bool _streaming = false; ///< the start command has been sent
     bool _gone = false;      ///< the service is gone, and that has been reported
     bool _ended = false;
+    bool _savesSoon = false; ///< a task is queued that saves what has been taken
 };
 
 } // namespace velmora

@@ -37,8 +37,10 @@ bool isFilledFile(int descriptor) {
 
 Result<std::unique_ptr<RecordingSession>> RecordingSession::open(const std::string& path, bool force) {
     std::unique_ptr<RecordingSession> session(new RecordingSession(path));
-    if (path == "-")
+    if (path == "-") {
+        session->_isLive = !isRegularFile(STDOUT_FILENO);
         return session;
+    }
     session->_file =
         FileDescriptor(::open(path.c_str(), O_WRONLY | O_CREAT | O_EXCL | O_CLOEXEC, newFileMode));
     session->_created = session->_file.get() >= 0;
@@ -49,6 +51,7 @@ Result<std::unique_ptr<RecordingSession>> RecordingSession::open(const std::stri
     }
     if (session->_file.get() < 0)
         return Failure{"cannot create " + path + ": " + std::generic_category().message(errno)};
+    session->_isLive = !isRegularFile(session->_file.get());
     return session;
 }
 

@@ -57,6 +57,8 @@ public:
     [[nodiscard]] const std::string& temporaryError() const { return _temporaryError; }
     /// Whether the queue is full.
     [[nodiscard]] bool isDropping() const { return _writer && _writer->isDropping(); }
+    /// Whether the recording goes to a pipe or the like, where a reader may wait for each message.
+    [[nodiscard]] bool isLive() const { return _isLive; }
     /// Whether the recording goes to a pipe whose reader has closed it.
     [[nodiscard]] bool hasClosedReader() const;
     /// Removes the file that this has created, if it is still empty: for a program that ends without
@@ -72,6 +74,7 @@ private:
     std::string _path;
     FileDescriptor _file;  ///< until the writer has it
     bool _created = false; ///< this created the file
+    bool _isLive = false;
     std::unique_ptr<PcapngWriter> _writer;
     std::string _technology;
     std::string _temporaryError;

@@ -58,7 +58,7 @@ bool copyPlainWord(char* to, const char* from) {
 
 /// Copies the text, at most up to the first byte that is not plain. Returns the number of bytes; those after
 /// them, up to the text's length, may have been written to as well. It may stop short of that byte, but not
-/// where the whole text is plain.
+/// where the entire text is plain.
 std::size_t copyPlain(char* to, std::string_view text) {
     std::size_t done = 0;
     for (; text.size() - done >= sizeof(Word); done += sizeof(Word))

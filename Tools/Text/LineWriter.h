@@ -26,7 +26,10 @@ protected:
     /// The current line is appended here.
     [[nodiscard]] TextBuffer& line() { return _lines; }
     void appendTime(Time moment) { _time.append(_lines, moment); }
+    void appendTime(TextBuffer& out, Time moment) { _time.append(out, moment); }
     void endLine(std::string_view end);
+    /// The current line is not to be written.
+    void dropLine() { _lines.truncate(_complete); }
 
 private:
     bool _isLive;

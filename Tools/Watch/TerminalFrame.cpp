@@ -17,7 +17,7 @@ constexpr const char* bold = "\x1b[1m";
 constexpr const char* reverse = "\x1b[7m";
 constexpr const char* plain = "\x1b[0m";
 
-/// Columns grow in such steps, so that a value which gains a digit does not move the whole screen.
+/// Columns grow in such steps, so that a value which gains a digit does not move the entire screen.
 constexpr std::size_t widthStep = 8;
 
 std::string statusLine(std::string_view status, const ScreenLayout& layout, std::size_t scroll,
@@ -79,6 +79,22 @@ std::string composeFrame(const std::vector<TreeRow>& rows, std::string_view stat
     }
     frame += statusLine(status, layout, first, size.columns);
     return frame;
+}
+
+std::vector<TreeRow> adviceRows(std::string_view text, std::size_t columns) {
+    std::vector<TreeRow> rows;
+    while (!text.empty()) {
+        std::size_t length = text.size();
+        if (length > columns) {
+            const std::size_t blank = text.rfind(' ', columns);
+            length = blank == text.npos || blank == 0 ? columns : blank;
+        }
+        rows.push_back({std::string(text.substr(0, length)), false});
+        text.remove_prefix(length);
+        while (text.starts_with(' '))
+            text.remove_prefix(1);
+    }
+    return rows;
 }
 
 std::size_t scrolledBy(Key key, std::size_t scroll, const ScreenLayout& layout) {

@@ -44,6 +44,9 @@ inline constexpr std::size_t columnGap = 3;
 [[nodiscard]] std::string composeFrame(const std::vector<TreeRow>& rows, std::string_view status,
                                        ScreenSize size, std::size_t scroll);
 
+/// Text in rows of at most that many columns, broken at blanks.
+[[nodiscard]] std::vector<TreeRow> adviceRows(std::string_view text, std::size_t columns);
+
 /// The scroll position after a key. `Quit` does not scroll.
 [[nodiscard]] std::size_t scrolledBy(Key key, std::size_t scroll, const ScreenLayout& layout);
 

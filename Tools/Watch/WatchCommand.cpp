@@ -6,16 +6,20 @@
 #include "Platform/DateText.h"
 #include "Platform/Linux/Files/LargeAllocations.h"
 #include "Platform/Linux/SignalWatcher.h"
+#include "Platform/TelephonyService.h"
 #include "Tools/ExitStatus.h"
+#include "Tools/Log/ConnectionLine.h"
 #include "Tools/Log/DecoderLog.h"
 #include "Tools/Log/ServiceLog.h"
 #include "Tools/Output.h"
 #include "Tools/Report.h"
 #include "Tools/ServiceClient.h"
+#include "Tools/Watch/WatchModel.h"
 #include "Tools/Watch/WatchView.h"
 
 #include <chrono>
-#include <functional>
+#include <cmath>
+#include <cstdint>
 #include <memory>
 #include <optional>
 #include <string>
@@ -32,47 +36,17 @@ using namespace std::chrono_literals;
 constexpr auto statusInterval = 250ms;
 constexpr const char* connecting = "Connecting...";
 
-/// A model that reports a change of the technology. A model's display is that of the first technology and
-/// stays so; another technology takes another model.
-class WatchModel final : public VelmoraModel {
-public:
-    WatchModel(ModelPlatform platform, ModelObserver* observer, DecoderLines& lines,
-               std::function<void()> technologyChanged)
-        : VelmoraModel(std::move(platform), observer), _lines(lines),
-          _technologyChanged(std::move(technologyChanged)) {}
-
-    void updateWithData(const Data& data) override {
-        const DecoderLog log(_lines);
-        VelmoraModel::updateWithData(data);
-    }
-
-protected:
-    [[nodiscard]] std::unique_ptr<LogGenerator>
-    generatorFromTechnology(std::string_view technology) override {
-        if (!_technology.empty() && _technology != technology)
-            _technologyChanged();
-        _technology = technology;
-        const DecoderLog log(_lines);
-        return VelmoraModel::generatorFromTechnology(technology);
-    }
-
-private:
-    DecoderLines& _lines;
-    std::function<void()> _technologyChanged;
-    std::string _technology;
-};
-
 /// The model's observer: passes each refresh to the view, and keeps the status line up to date in between.
 class Watcher final : public ModelObserver {
 public:
     Watcher(const WatchOptions& options, DecoderLines& lines, Output& output, ServiceClient& client)
-        : _client(client), _lines(lines), _once(options.once), _model(newModel()) {
-        if (!_once && Terminal::isThere())
+        : _client(client), _lines(lines), _options(options), _model(newModel()) {
+        if (!_options.once && Terminal::isThere())
             _view = std::make_unique<ScreenView>([this] { _client.loop.quit(ExitStatus::Done); });
         else
             _view = std::make_unique<PipeView>(output);
         // Over the view's own, which holds what is written.
-        _log.emplace(lines);
+        _log.emplace(lines, [this](const std::string& problem) { showProblem(problem); });
     }
 
     /// Until the user, a signal or a closed pipe ends it.
@@ -85,6 +59,10 @@ public:
         _client.queue.async([this] { _model->restartMonitor(); });
         // The first check comes after the first attempt to connect.
         _client.queue.async([this] { checkStatus(); });
+        if (_options.timeout_seconds)
+            _client.queue.after(std::chrono::nanoseconds(
+                                    static_cast<std::int64_t>(std::llround(*_options.timeout_seconds * 1e9))),
+                                [this] { giveUp(); });
         _statusTimer = _client.queue.repeating(statusInterval, [this] { checkStatus(); });
         const int status = _client.loop.run();
         _statusTimer.reset();
@@ -94,18 +72,48 @@ public:
 
     void updateViewControllerFromModel() override {
         const NodeRef root = displayNodes();
+        clearProblem();
         if (_model->isConnected())
             _updateMessage = "Updated " + localDateAndTime(_client.clock, _client.clock.now(), " at ");
         _shownStatus = status();
         _view->showRefresh(_shownStatus, root ? treeRows(*root) : std::vector<TreeRow>());
-        if (_once || !_view->isOpen())
+        _hasRefresh = true;
+        if (_options.once || !_view->isOpen())
             _client.loop.quit(ExitStatus::Done);
     }
 
 private:
     [[nodiscard]] std::shared_ptr<VelmoraModel> newModel() {
-        return std::make_shared<WatchModel>(_client.platform(), this, _lines,
-                                            [this] { _client.queue.async([this] { beginAnew(); }); });
+        WatchModel::Events events;
+        events.changed = [this](std::string_view technology) {
+            _view->showNote("the technology is " + std::string(shortTechnologyName(technology)) + " now", {});
+            _client.queue.async([this] { beginAnew(); });
+        };
+        events.unknown = [this](std::string_view technology) {
+            _log->setCause("the telephony service's technology " +
+                           std::string(shortTechnologyName(technology)) +
+                           " has no decoder here, wanted one of " + technologyNames());
+        };
+        return std::make_shared<WatchModel>(_client.platform(), this, _lines, std::move(events));
+    }
+
+    void showProblem(const std::string& problem) {
+        _view->showNote(problem, problem == noService ? serviceAdvice : std::string());
+    }
+
+    void clearProblem() {
+        if (!_model->isConnected())
+            return;
+        _log->clearProblem();
+        _view->showNote({}, {});
+    }
+
+    /// There has been time for the first refresh.
+    void giveUp() {
+        if (_hasRefresh)
+            return;
+        report(timeoutMessage(_log->problem(), *_options.timeout_seconds));
+        _client.loop.quit(ExitStatus::BadInput);
     }
 
     [[nodiscard]] NodeRef displayNodes() {
@@ -126,8 +134,10 @@ private:
             _client.loop.quit(ExitStatus::Done);
             return;
         }
+        if (!_log->problem().empty())
+            clearProblem();
         // Connected again, but without a refresh so far: the line stays until there is one.
-        if (_once || _model->isConnected() || _shownStatus == connecting)
+        if (_options.once || _model->isConnected() || _shownStatus == connecting)
             return;
         _shownStatus = connecting;
         _view->showStatus(_shownStatus);
@@ -135,7 +145,8 @@ private:
 
     ServiceClient& _client;
     DecoderLines& _lines;
-    bool _once;
+    const WatchOptions& _options;
+    bool _hasRefresh = false;
     std::shared_ptr<VelmoraModel> _model;
     std::unique_ptr<WatchView> _view;
     std::optional<ServiceLog> _log;

@@ -3,13 +3,20 @@
 
 #include "Tools/Watch/WatchOptions.h"
 
-#include <CLI/CLI.hpp>
+#include "Tools/CommandOptions.h"
 
 namespace velmora {
 
 CLI::App* addWatch(CLI::App& app, WatchOptions& options) {
     CLI::App* command = app.add_subcommand("watch", "Show what the telephony service reports, live");
-    command->add_flag("--once", options.once, "Print the first refresh and exit");
+    CLI::Option* const once = command->add_flag("--once", options.once, "Print the first refresh and exit");
+    command
+        ->add_option("--timeout", options.timeout_seconds,
+                     "With --once: end with status 1 if there is no refresh after this time, as without a "
+                     "telephony service; the default is to wait")
+        ->needs(once)
+        ->check(positiveSeconds())
+        ->type_name("SECONDS");
     command->footer(
         "On a terminal the screen is redrawn in place: arrows, j, k, PgUp, PgDn, Home and End scroll,\n"
         "q quits. On a pipe each refresh is printed, one after another.\n\n"

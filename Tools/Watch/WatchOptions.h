@@ -3,6 +3,8 @@
 
 #pragma once
 
+#include <optional>
+
 namespace CLI {
 class App;
 }
@@ -11,7 +13,8 @@ namespace velmora {
 
 /// `velmora-log watch`: the display tree of what the telephony service reports, kept up to date.
 struct WatchOptions {
-    bool once = false; ///< print the first refresh and end
+    bool once = false;                     ///< print the first refresh and end
+    std::optional<double> timeout_seconds; ///< with `once`: how long to wait for that
 };
 
 /// Adds the command with its options, help and examples. Parsing fills `options`, which must outlive `app`.

@@ -3,6 +3,9 @@
 
 #include "Tools/Watch/WatchView.h"
 
+#include "Tools/Report.h"
+#include "Tools/Text/PrintableText.h"
+
 #include <utility>
 
 #include <unistd.h>
@@ -22,6 +25,11 @@ void PipeView::showStatus(const std::string& status) {
     showRefresh(status, {});
 }
 
+void PipeView::showNote(const std::string& note, const std::string& advice) {
+    if (!note.empty())
+        report(advice.empty() ? note : note + "; " + advice);
+}
+
 ScreenView::ScreenView(std::function<void()> quit)
     : _quit(std::move(quit)),
       _deferredLog(::isatty(STDERR_FILENO) != 0 ? std::make_unique<DeferredLog>() : nullptr),
@@ -39,6 +47,22 @@ void ScreenView::showStatus(const std::string& status) {
     draw();
 }
 
+void ScreenView::showNote(const std::string& note, const std::string& advice) {
+    if (printable(note) == _note && advice == _advice)
+        return;
+    _note = printable(note);
+    _advice = advice;
+    if (!_status.empty()) // the first one comes once the first attempt to connect is over
+        draw();
+}
+
+/// The rows, or the advice, a row for each window's width of it.
+std::vector<TreeRow> ScreenView::shownRows() const {
+    if (!_rows.empty() || _advice.empty())
+        return _rows;
+    return adviceRows(_advice, _terminal.size().columns);
+}
+
 void ScreenView::restoreTerminal() {
     _terminal.restore();
     if (_deferredLog)
@@ -52,14 +76,15 @@ void ScreenView::handleInput(std::string_view bytes) {
             _quit();
             return;
         }
-        _scroll = scrolledBy(key, _scroll, layoutOf(_rows, _terminal.size()));
+        _scroll = scrolledBy(key, _scroll, layoutOf(shownRows(), _terminal.size()));
     }
     if (_scroll != before)
         draw();
 }
 
 void ScreenView::draw() {
-    _terminal.draw(composeFrame(_rows, _status, _terminal.size(), _scroll));
+    const std::string status = _note.empty() ? _status : _status + " " + _note;
+    _terminal.draw(composeFrame(shownRows(), status, _terminal.size(), _scroll));
 }
 
 } // namespace velmora

@@ -23,18 +23,22 @@ public:
     virtual void showRefresh(const std::string& status, std::vector<TreeRow> rows) = 0;
     /// The connection is lost or re-established; the rows are unchanged.
     virtual void showStatus(const std::string& status) = 0;
+    /// Something about the connection that the user should know, with what to do about it, which may be
+    /// empty. An empty note takes the earlier one away.
+    virtual void showNote(const std::string& note, const std::string& advice) = 0;
     /// Whether there is still a reader or a terminal.
     [[nodiscard]] virtual bool isOpen() const = 0;
     /// Restores the terminal, if one is in use.
     virtual void restoreTerminal() {}
 };
 
-/// Prints each refresh after its status line, a blank line between two.
+/// Prints each refresh after its status line, a blank line between two; notes go to standard error.
 class PipeView final : public WatchView {
 public:
     explicit PipeView(Output& output) : _output(output) {}
     void showRefresh(const std::string& status, std::vector<TreeRow> rows) override;
     void showStatus(const std::string& status) override;
+    void showNote(const std::string& note, const std::string& advice) override;
     [[nodiscard]] bool isOpen() const override { return _output.isOpen() && !_output.hasClosedReader(); }
 
 private:
@@ -42,19 +46,21 @@ private:
     bool _begun = false;
 };
 
-/// Shows the latest refresh on the terminal. Log lines that would run into the screen are held until it is
-/// restored.
+/// Shows the latest refresh on the terminal, a note after the status, and the advice where there are no rows.
+/// Log lines that would run into the screen are held until it is restored.
 class ScreenView final : public WatchView {
 public:
     /// `quit` is called when the user quits or the terminal has been closed.
     explicit ScreenView(std::function<void()> quit);
     void showRefresh(const std::string& status, std::vector<TreeRow> rows) override;
     void showStatus(const std::string& status) override;
+    void showNote(const std::string& note, const std::string& advice) override;
     [[nodiscard]] bool isOpen() const override { return true; }
     void restoreTerminal() override;
 
 private:
     void handleInput(std::string_view bytes);
+    [[nodiscard]] std::vector<TreeRow> shownRows() const;
     void draw();
 
     std::function<void()> _quit;
@@ -63,6 +69,8 @@ private:
     Terminal _terminal;
     KeyReader _keys;
     std::string _status;
+    std::string _note;
+    std::string _advice;
     std::vector<TreeRow> _rows;
     std::size_t _scroll = 0;
 };

@@ -15,7 +15,8 @@ constexpr std::size_t minimumLength = 25; // the pilots follow
 constexpr std::size_t countAt = 15;
 constexpr std::size_t pilotLength = 12;
 
-constexpr List pilotList{"kActiveSetPilots", List::Entries::Numbered, "(none)"};
+constexpr Content listContents[] = {pilotEnergy};
+constexpr List pilotList{"kActiveSetPilots", List::Entries::Numbered, "(none)", listContents};
 
 } // namespace
 
@@ -43,6 +44,10 @@ void ActiveSetPilots::decode(const Reading& reading, FieldVisitor& visitor) cons
         visitor.real(pilotEnergy, decibelsOf512ths(pilots[i].u16(2)));
     }
     visitor.endList();
+}
+
+void ActiveSetPilots::describe(ContentVisitor& visitor) const {
+    visitor.list(pilotList);
 }
 
 } // namespace velmora::C2K

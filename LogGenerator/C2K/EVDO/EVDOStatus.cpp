@@ -31,16 +31,25 @@ constexpr EnumTexts sessionStates(sessionStateRows, "[Reserved ", "]");
 constexpr Place deviceState = u8At(36);
 
 constexpr ValueField fields[] = {
-    {"kChannel", bitsAt(13, 0, 11), integer("%d")},
-    {"k1xEVDODeviceState", deviceState, text(deviceStates)}, // published second, earlier than its offset
-    {"kBandClass", bitsAt(14, 3, 5), text(bandClasses)},
-    {"kRxAGC0", i8At(15), integer("%+d dBm")},
+    {"kChannel", bitsAt(13, 0, 11), integer("%d"), {.role = Role::ServingChannel, .clause = "3GPP2 C.S0057"}},
+    {"k1xEVDODeviceState",
+     deviceState,
+     text(deviceStates),
+     {.role = Role::RadioState}}, // published second, earlier than its offset
+    {"kBandClass", bitsAt(14, 3, 5), text(bandClasses), {.clause = "3GPP2 C.S0057 1.5"}},
+    {"kRxAGC0", i8At(15), integer("%+d dBm"), {.role = Role::ServingLevel}},
     {"kRxAGC1", i8At(16), integer("%+d dBm"), Validity::WhileConnected},
     {"kTxAGC", i8At(17), integer("%+d dBm"), Validity::WhileConnected},
-    {"kServingPNOffset", u16At(18), unless(0xFFFF, "Invalid Value", integer("%d \u00D7 64chips"))},
+    {"kServingPNOffset",
+     u16At(18),
+     unless(0xFFFF, "Invalid Value", integer("%d \u00D7 64chips")),
+     {.role = Role::ServingPhysicalCell, .clause = "3GPP2 C.S0024"}},
     {"kSessionState", u8At(37), text(sessionStates)},
-    {"kUATI24", bitsAt(38, 0, 24), hexadecimal()},
-    {"kColorCode", u8At(41), integer("%d")},
+    {"kUATI24",
+     bitsAt(38, 0, 24),
+     hexadecimal(),
+     {.identity = Identity::Subscriber, .clause = "3GPP2 C.S0024"}},
+    {"kColorCode", u8At(41), integer("%d"), {.identity = Identity::Location, .clause = "3GPP2 C.S0024"}},
 };
 static_assert(endOf(fields, true) <= exactLength);
 
@@ -58,6 +67,10 @@ std::optional<Reading> EVDOStatus::accept(const Record& record, Dictionary&) con
 void EVDOStatus::decode(const Reading& reading, FieldVisitor& visitor) const {
     // A reserved state above Connected counts as connected.
     visitFields(fields, reading.record, deviceState.read(reading.record) >= accessState, visitor);
+}
+
+void EVDOStatus::describe(ContentVisitor& visitor) const {
+    describeFields(fields, visitor);
 }
 
 } // namespace velmora::C2K

@@ -16,7 +16,8 @@ constexpr std::size_t countAt = 22;
 constexpr std::size_t fingerLength = 14;
 constexpr std::uint16_t unassigned = 0xFFFF;
 
-constexpr List fingerList{"kFingerC2I", List::Entries::Numbered, "(none)"};
+constexpr Content listContents[] = {pilotEnergy};
+constexpr List fingerList{"kFingerC2I", List::Entries::Numbered, "(none)", listContents};
 
 } // namespace
 
@@ -50,6 +51,10 @@ void FingerC2I::decode(const Reading& reading, FieldVisitor& visitor) const {
         }
     }
     visitor.endList();
+}
+
+void FingerC2I::describe(ContentVisitor& visitor) const {
+    visitor.list(fingerList);
 }
 
 } // namespace velmora::C2K

@@ -26,7 +26,7 @@ constexpr std::uint32_t weights[] = {
 };
 static_assert(std::size(weights) == 56 && countersAt + 4 * std::size(weights) <= minimumLength);
 
-constexpr Field rate{"kFLDataRate", computed, real("%.2f kbps")};
+constexpr Field rate{"kFLDataRate", computed, real("%.2f kbps"), {.role = Role::DataRate, .absent = ""}};
 constexpr DataRateKeys keys = {
     .sequence = "FLDataSeqNum",
     .sent = "FLDataSent",
@@ -52,6 +52,10 @@ std::optional<Reading> ForwardLinkDataRate::accept(const Record& record, Diction
 
 void ForwardLinkDataRate::decode(const Reading& reading, FieldVisitor& visitor) const {
     visitDataRate(rate, reading, visitor);
+}
+
+void ForwardLinkDataRate::describe(ContentVisitor& visitor) const {
+    visitor.field(rate);
 }
 
 } // namespace velmora::C2K

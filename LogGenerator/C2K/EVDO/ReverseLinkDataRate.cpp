@@ -29,7 +29,7 @@ static_assert(std::size(weights) == 12 &&
               groupsAt[1] + 11 * sizeStride + (blocks - 1) * blockStride + 4 * countersInGroup <=
                   minimumLength);
 
-constexpr Field rate{"kRLDataRate", computed, real("%.2f kbps")};
+constexpr Field rate{"kRLDataRate", computed, real("%.2f kbps"), {.role = Role::DataRate, .absent = ""}};
 constexpr DataRateKeys keys = {
     .sequence = "RLDataSeqNum",
     .sent = "RLDataSent",
@@ -72,6 +72,10 @@ std::optional<Reading> ReverseLinkDataRate::accept(const Record& record, Diction
 
 void ReverseLinkDataRate::decode(const Reading& reading, FieldVisitor& visitor) const {
     visitDataRate(rate, reading, visitor);
+}
+
+void ReverseLinkDataRate::describe(ContentVisitor& visitor) const {
+    visitor.field(rate);
 }
 
 } // namespace velmora::C2K

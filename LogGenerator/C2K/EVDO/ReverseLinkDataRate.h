@@ -14,6 +14,7 @@ public:
     [[nodiscard]] std::string_view name() const override { return "Reverse-link data rate"; }
     [[nodiscard]] std::optional<Reading> accept(const Record& record, Dictionary& state) const override;
     void decode(const Reading& reading, FieldVisitor& visitor) const override;
+    void describe(ContentVisitor& visitor) const override;
 };
 
 } // namespace velmora::C2K

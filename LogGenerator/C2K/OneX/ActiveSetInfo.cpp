@@ -16,11 +16,13 @@ namespace {
 constexpr std::size_t pnOffsetAt = 12;
 constexpr std::size_t firstEnergyAt = 24;
 
-constexpr List pilotList{"k1xActiveSetInfo", List::Entries::Numbered, ""};
+constexpr Content listContents[] = {pilotEnergy, referencePilotEnergy};
 
 constexpr double leastRatio = 0.00001; // -50 dB
 
 } // namespace
+
+const List ActiveSetInfo::pilotList{"k1xActiveSetInfo", List::Entries::Numbered, "", listContents};
 
 ActiveSetInfo::ActiveSetInfo(const Record& subPacket)
     : _subPacket(subPacket), _n(subPacket.u16(4)), _g(subPacket.u8(6)), _s(subPacket.u8(7)),

@@ -16,6 +16,9 @@ public:
     /// What precedes the pilots.
     static constexpr std::size_t headerLength = 12;
 
+    /// The pilots.
+    static const List pilotList;
+
     /// `subPacket`: the record from the sub-packet's start on. Precondition: it has the header.
     explicit ActiveSetInfo(const Record& subPacket);
 

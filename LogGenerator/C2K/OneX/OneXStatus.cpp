@@ -39,7 +39,7 @@ constexpr EnumTexts deviceStates(deviceStateRows, "[Bad Value ", "]");
 constexpr std::uint8_t trafficState = 8;
 
 constexpr ValueField systemStateFields[] = {
-    {"k1xDeviceState", u8At(4), text(deviceStates)},
+    {"k1xDeviceState", u8At(4), text(deviceStates), {.role = Role::RadioState}},
 };
 
 // 0x119C, sub-packet 2: band class (3GPP2 C.S0057), CDMA channel number (C.S0057); levels on the modem's own
@@ -47,16 +47,21 @@ constexpr ValueField systemStateFields[] = {
 constexpr TextFormat receiveLevel = real("%+.2f dBm", 0.334, -63.248);
 
 constexpr ValueField radioFields[] = {
-    {"k1xRx0BandClass", u8At(4), text(bandClasses)},
-    {"k1xRx0ChanNum", u16At(6), integer("%d")},
-    {"k1xRxAGC0", i8At(10), receiveLevel},
-    {"k1xRx1BandClass", u8At(5), text(bandClasses), Validity::WhileConnected},
-    {"k1xRx1ChanNum", u16At(8), integer("%d"), Validity::WhileConnected},
+    {"k1xRx0BandClass", u8At(4), text(bandClasses), {.clause = "3GPP2 C.S0057 1.5"}},
+    {"k1xRx0ChanNum", u16At(6), integer("%d"), {.role = Role::ServingChannel, .clause = "3GPP2 C.S0057"}},
+    {"k1xRxAGC0", i8At(10), receiveLevel, {.role = Role::ServingLevel}},
+    {"k1xRx1BandClass",
+     u8At(5),
+     text(bandClasses),
+     Validity::WhileConnected,
+     {.clause = "3GPP2 C.S0057 1.5"}},
+    {"k1xRx1ChanNum", u16At(8), integer("%d"), Validity::WhileConnected, {.clause = "3GPP2 C.S0057"}},
     {"k1xRxAGC1", i8At(11), receiveLevel, Validity::WhileConnected},
     {"k1xTxAGC", i16At(12), real("%+.2f dBm", 0.1), Validity::WhileConnected},
 };
 
-constexpr Field oldFrameErrorRate{"k1xTrafficFER", computed, real("%.02f%% (old)")};
+constexpr Field oldFrameErrorRate{
+    "k1xTrafficFER", computed, real("%.02f%% (old)"), {.role = Role::BlockErrorRate}};
 constexpr KeptRecords::Parts status = 1;
 constexpr KeptRecords::Parts closedAverage = 2;
 
@@ -128,6 +133,17 @@ void OneXStatus::decode(const Reading& reading, FieldVisitor& visitor) const {
         const auto average = static_cast<float>(*reading.number);
         visitor.real(oldFrameErrorRate, static_cast<double>(average * 100.0F));
     }
+}
+
+void OneXStatus::describe(ContentVisitor& visitor) const {
+    visitor.subPacket(systemState);
+    describeFields(systemStateFields, visitor);
+    visitor.subPacket(radioFrequency);
+    describeFields(radioFields, visitor);
+    visitor.subPacket(activeSet);
+    visitor.list(ActiveSetInfo::pilotList);
+    visitor.subPacket(0);
+    visitor.field(oldFrameErrorRate);
 }
 
 } // namespace velmora::C2K

@@ -34,31 +34,37 @@ constexpr EnumText roamingIndicatorRows[] = {
 constexpr EnumTexts roamingIndicators(roamingIndicatorRows, "ERI - ", "");
 
 constexpr ValueField roaming[] = {
-    {"k1xRoamingHome", u32At(42), text(roamingIndicators)},
+    {"k1xRoamingHome", u32At(42), text(roamingIndicators), {.clause = "3GPP2 C.R1001"}},
 };
 constexpr std::size_t systemTypeAt = 46;
 constexpr std::uint32_t cdmaSystem = 2;
 constexpr ValueField identities[] = {
     // In a system of another type these bytes mean something else.
-    {"kSystemId", u16At(50), integer("%d")},
-    {"kNetworkId", u16At(52), integer("%d")},
+    {"kSystemId", u16At(50), integer("%d"), {.identity = Identity::Location, .clause = "3GPP2 C.S0005"}},
+    {"kNetworkId", u16At(52), integer("%d"), {.identity = Identity::Location, .clause = "3GPP2 C.S0005"}},
 };
 constexpr ValueField zone[] = {
-    {"kPacketZoneId", u8At(131), integer("%d")},
+    {"kPacketZoneId", u8At(131), integer("%d"), {.identity = Identity::Location, .clause = "3GPP2 C.S0005"}},
 };
 constexpr ValueField baseStation[] = {
-    {"kBaseId", u16At(184), integer("%d")}, // past the minimum length
+    {"kBaseId",
+     u16At(184),
+     integer("%d"),
+     {.role = Role::ServingCell,
+      .identity = Identity::Location,
+      .clause = "3GPP2 C.S0005"}}, // past the minimum length
 };
 constexpr ValueField revision[] = {
-    {"kProtocolRevision", u8At(133), integer("%d")},
+    {"kProtocolRevision", u8At(133), integer("%d"), {.clause = "3GPP2 C.S0005"}},
 };
 static_assert(endOf(roaming, true) <= minimumLength && endOf(identities, true) <= minimumLength &&
               endOf(zone, true) <= minimumLength && endOf(revision, true) <= minimumLength);
 
 /// Shown in place of the identities of a system of another type.
 constexpr EnumTexts unknownTypes("(unknown system type ", ")");
-constexpr Field unknownSystem{"kSystemId", u32At(systemTypeAt), text(unknownTypes)};
-constexpr Field unknownNetwork{"kNetworkId", u32At(systemTypeAt), text(unknownTypes)};
+constexpr Meaning noIdentity{.isAbsence = true};
+constexpr Field unknownSystem{"kSystemId", u32At(systemTypeAt), text(unknownTypes), noIdentity};
+constexpr Field unknownNetwork{"kNetworkId", u32At(systemTypeAt), text(unknownTypes), noIdentity};
 
 constexpr KeptRecords::Parts identification = 1;
 constexpr KeptRecords::Parts baseStationPart = 2;
@@ -105,6 +111,14 @@ void SystemIdentification::decode(const Reading& reading, FieldVisitor& visitor)
         visitFields(baseStation, record, true, visitor);
     if ((reading.parts & identification) != 0)
         visitFields(revision, record, true, visitor);
+}
+
+void SystemIdentification::describe(ContentVisitor& visitor) const {
+    for (const std::span<const ValueField> fields :
+         {std::span<const ValueField>(roaming), {identities}, {zone}, {baseStation}, {revision}})
+        describeFields(fields, visitor);
+    visitor.field(unknownSystem);
+    visitor.field(unknownNetwork);
 }
 
 } // namespace velmora::C2K

@@ -15,7 +15,7 @@ namespace {
 constexpr std::uint8_t trafficDemodulation = 11;
 constexpr std::size_t erasureAt = 24; // in the sub-packet
 
-constexpr Field frameErrorRate{"k1xTrafficFER", computed, real("%.02f%%")};
+constexpr Field frameErrorRate{"k1xTrafficFER", computed, real("%.02f%%"), {.role = Role::BlockErrorRate}};
 
 } // namespace
 
@@ -40,6 +40,10 @@ std::optional<Reading> TrafficFER::accept(const Record& record, Dictionary& stat
 void TrafficFER::decode(const Reading& reading, FieldVisitor& visitor) const {
     const auto average = static_cast<float>(*reading.number);
     visitor.real(frameErrorRate, static_cast<double>(average * 100.0F));
+}
+
+void TrafficFER::describe(ContentVisitor& visitor) const {
+    visitor.field(frameErrorRate);
 }
 
 } // namespace velmora::C2K

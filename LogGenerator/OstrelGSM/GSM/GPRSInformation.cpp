@@ -18,7 +18,7 @@ constexpr EnumText si13PositionRows[] = {
 constexpr EnumTexts si13Positions(si13PositionRows, "Unknown");
 
 constexpr Field si13Fields[] = {
-    {"SI13 Position", u8At(14), text(si13Positions)},
+    {"SI13 Position", u8At(14), text(si13Positions), {.clause = "3GPP TS 44.018 10.5.2.34"}},
 };
 constexpr Layout si13 = layout(15, si13Fields);
 
@@ -53,9 +53,9 @@ constexpr EnumText accessThresholdRows[] = {
 constexpr EnumTexts accessThresholds(accessThresholdRows, "Unknown");
 
 constexpr Field cellOptionFields[] = {
-    {"Network Control Order", u8At(15), text(controlOrders)},
-    {"PFC Supported", u8At(13), text(pfcSupport)},
-    {"Priority Access Threshold", u8At(14), text(accessThresholds)},
+    {"Network Control Order", u8At(15), text(controlOrders), {.clause = "3GPP TS 44.018 10.5.2.37b"}},
+    {"PFC Supported", u8At(13), text(pfcSupport), {.clause = "3GPP TS 44.060 12.24"}},
+    {"Priority Access Threshold", u8At(14), text(accessThresholds), {.clause = "3GPP TS 44.018 10.5.2.37b"}},
 };
 constexpr Layout cellOptions = layout(18, cellOptionFields);
 
@@ -68,9 +68,12 @@ constexpr EnumText t3192Rows[] = {
 constexpr EnumTexts t3192(t3192Rows, "?? ms");
 
 constexpr Field timerFields[] = {
-    {"T3192", u8At(15), text(t3192)},
-    {"Access Burst Type", u8At(17), flag("11-bit format", "8-bit format")},
-    {"DRX Timer Max", u8At(16), integer("%d")},
+    {"T3192", u8At(15), text(t3192), {.clause = "3GPP TS 44.060 12.24"}},
+    {"Access Burst Type",
+     u8At(17),
+     flag("11-bit format", "8-bit format"),
+     {.clause = "3GPP TS 44.060 12.24"}},
+    {"DRX Timer Max", u8At(16), integer("%d"), {.clause = "3GPP TS 44.060 12.24"}},
 };
 constexpr Layout timers = layout(24, timerFields);
 
@@ -92,7 +95,7 @@ constexpr Layout systemInformation = layout(35, systemInformationFields);
 
 // 0x5137: whether CELL_RESELECT_HYSTERESIS (3GPP TS 45.008) is applied, as the modem reports it.
 constexpr Field reselectionFields[] = {
-    {"Cell Reselect Hysteresis", u8At(26), flag("Applied", "Not Applied")},
+    {"Cell Reselect Hysteresis", u8At(26), flag("Applied", "Not Applied"), {.clause = "3GPP TS 45.008"}},
 };
 constexpr Layout reselection = layout(29, reselectionFields);
 
@@ -105,7 +108,7 @@ constexpr EnumText operatingModeRows[] = {
 constexpr EnumTexts operatingModes(operatingModeRows, "Unknown");
 
 constexpr Field networkFields[] = {
-    {"Network Operating Mode", u8At(13), text(operatingModes)},
+    {"Network Operating Mode", u8At(13), text(operatingModes), {.clause = "3GPP TS 44.060 12.24"}},
 };
 constexpr Layout network = layout(32, networkFields);
 

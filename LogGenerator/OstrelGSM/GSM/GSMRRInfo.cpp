@@ -38,7 +38,7 @@ constexpr EnumText rrStateRows[] = {
 constexpr EnumTexts rrStates(rrStateRows, "Unknown");
 
 constexpr Field stateFields[] = {
-    {"RR State", u8At(13), text(rrStates)},
+    {"RR State", u8At(13), text(rrStates), {.role = Role::RadioState}},
     {"RR Sub State", u8At(14), integer("%d")},
     {"RR Status", u8At(15), integer("%d")},
     {"RR Mode", u8At(16), flag("Data", "Voice")},

@@ -16,20 +16,23 @@ static_assert(count.end() <= minimumLength);
 
 // ARFCN (3GPP TS 45.005 2), BSIC (TS 23.003 4.3.2); level and ranking as the modem reports them.
 constexpr Field cellFields[] = {
-    {"ARFCN", u16At(0), integer("%d")},
-    {"BSIC", u16At(2), integer("%d")},
+    {"ARFCN", u16At(0), integer("%d"), {.clause = "3GPP TS 45.005 2"}},
+    {"BSIC", u16At(2), integer("%d"), {.clause = "3GPP TS 23.003 4.3.2"}},
     {"RSSI", i8At(4), integer("%d dBm")},
     {"Ranking Value", i16At(5), integer("%d")},
 };
 constexpr Layout cell = layout(7, cellFields);
-constexpr List rows{};
+constexpr Content cellContents[] = {cell};
+constexpr std::string_view cellKeys[] = {"ARFCN", "BSIC"};
+constexpr List rows{.contents = cellContents, .keys = cellKeys};
+constexpr Content contents[] = {rows};
 
 CountedList cells(const Record& record) {
     return CountedList(record, minimumLength, cell.minimumLength,
                        static_cast<std::size_t>(count.read(record)));
 }
 
-constexpr View sectionViews[] = {{0x4005, minimumLength}};
+constexpr View sectionViews[] = {{0x4005, minimumLength, contents}};
 
 } // namespace
 

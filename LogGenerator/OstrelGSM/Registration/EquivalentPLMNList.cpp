@@ -24,11 +24,20 @@ CountedList networks(const Record& record) {
     return CountedList(record, minimumLength, stride, entryLength, record.u8(16));
 }
 
-constexpr List rows{};
-constexpr Field countryCode{"Mobile Country Code", computed, integer("%d")};
-constexpr Field networkCode{"Mobile Network Code", computed, integer("%d")};
+constexpr Field countryCode{"Mobile Country Code",
+                            computed,
+                            integer("%d"),
+                            {.digits = 3, .identity = Identity::Location, .clause = "3GPP TS 23.003 2.2"}};
+constexpr Field networkCode{"Mobile Network Code",
+                            computed,
+                            integer("%d"),
+                            {.digits = 2, .identity = Identity::Location, .clause = "3GPP TS 23.003 2.2"}};
 
-constexpr View sectionViews[] = {{0x7150, minimumLength}};
+constexpr Content networkContents[] = {countryCode, networkCode};
+constexpr std::string_view networkKeys[] = {"Mobile Country Code", "Mobile Network Code"};
+constexpr List rows{.contents = networkContents, .keys = networkKeys};
+constexpr Content contents[] = {rows};
+constexpr View sectionViews[] = {{0x7150, minimumLength, contents}};
 
 } // namespace
 

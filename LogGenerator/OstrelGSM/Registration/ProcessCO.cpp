@@ -12,7 +12,7 @@ namespace {
 
 // 0x7131: the main MM state (3GPP TS 24.008 4.1.2.1).
 constexpr Field stateFields[] = {
-    {"MM State", u8At(13), text(OstrelGSM::mmStates)},
+    {"MM State", u8At(13), text(OstrelGSM::mmStates), {.clause = "3GPP TS 24.008 4.1.2.1"}},
 };
 constexpr Layout state = layout(16, stateFields);
 

@@ -30,9 +30,9 @@ constexpr EnumText updateStatusRows[] = {
 constexpr EnumTexts updateStatuses(updateStatusRows, "Unknown");
 
 constexpr Field stateFields[] = {
-    {"MM State", u8At(13), text(OstrelGSM::mmStates)},
-    {"MM Sub State", u8At(14), text(subStates)},
-    {"LU Reject Cause", u8At(15), text(updateStatuses)},
+    {"MM State", u8At(13), text(OstrelGSM::mmStates), {.clause = "3GPP TS 24.008 4.1.2.1"}},
+    {"MM Sub State", u8At(14), text(subStates), {.clause = "3GPP TS 24.008 4.1.2.1"}},
+    {"LU Reject Cause", u8At(15), text(updateStatuses), {.clause = "3GPP TS 24.008 4.1.2.2"}},
 };
 constexpr Layout state = layout(16, stateFields);
 

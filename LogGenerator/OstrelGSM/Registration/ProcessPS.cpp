@@ -50,9 +50,9 @@ constexpr EnumTexts updateStatuses(updateStatusRows, "Unknown");
 
 // The first label is the same as the circuit-switched state's, on purpose.
 constexpr Field stateFields[] = {
-    {"MM State", u8At(13), text(states)},
-    {"MM Sub State", u8At(14), text(subStates)},
-    {"Attach Reject Cause", u8At(15), text(updateStatuses)},
+    {"MM State", u8At(13), text(states), {.clause = "3GPP TS 24.008 4.1.3.1"}},
+    {"MM Sub State", u8At(14), text(subStates), {.clause = "3GPP TS 24.008 4.1.3.1"}},
+    {"Attach Reject Cause", u8At(15), text(updateStatuses), {.clause = "3GPP TS 24.008 4.1.3.2"}},
 };
 constexpr Layout state = layout(16, stateFields);
 

@@ -23,21 +23,39 @@ constexpr EnumText serviceTypeRows[] = {
 constexpr EnumTexts serviceTypes(serviceTypeRows, "Unknown");
 
 constexpr Field selectionFields[] = {
-    {"PLMN Sel Mod", u8At(14), text(selectionModes)},
+    {"PLMN Sel Mod", u8At(14), text(selectionModes), {.clause = "3GPP TS 23.122 4.4"}},
 };
 constexpr Layout selection = layout(16, selectionFields);
 
 // 0x7135: the location area identification (3GPP TS 24.008 10.5.1.3) at 15 to 19, its PLMN identity first,
 // and the RAC (TS 24.008 10.5.5.15).
 constexpr Field areaFields[] = {
-    {"Location Area Code", u16BigEndianAt(18), integer("%d")},
-    {"Routing Area Code", u8At(20), integer("%d")},
+    {"Location Area Code",
+     u16BigEndianAt(18),
+     integer("%d"),
+     {.role = Role::ServingArea, .identity = Identity::Location, .clause = "3GPP TS 23.003 4.1"}},
+    {"Routing Area Code",
+     u8At(20),
+     integer("%d"),
+     {.identity = Identity::Location, .clause = "3GPP TS 23.003 4.2"}},
     {"Service Type", u8At(14), text(serviceTypes)},
 };
 constexpr Layout areas = layout(32, areaFields);
 constexpr std::uint32_t identityCode = 0x7135;
-constexpr Field countryCode{"Mobile Country Code", computed, plainText()};
-constexpr Field networkCode{"Mobile Network Code", computed, plainText()};
+constexpr Field countryCode{"Mobile Country Code",
+                            computed,
+                            plainText(),
+                            {.role = Role::ServingCountryCode,
+                             .digits = 3,
+                             .identity = Identity::Location,
+                             .clause = "3GPP TS 23.003 2.2"}};
+constexpr Field networkCode{"Mobile Network Code",
+                            computed,
+                            plainText(),
+                            {.role = Role::ServingNetworkCode,
+                             .digits = 2,
+                             .identity = Identity::Location,
+                             .clause = "3GPP TS 23.003 2.2"}};
 
 /// A BCD digit as its character; a filler (10 and above) is a blank.
 char digit(unsigned halfByte) {
@@ -59,12 +77,30 @@ void visitIdentity(const Record& record, FieldVisitor& visitor) {
 // As the telephony service reports it: plain decimal numbers, so that a leading zero of the MNC is lost,
 // under the labels that 0x7135 writes as three characters: whichever arrived last is shown.
 constexpr CellField cellFields[] = {
-    {kVoxCellMonitorMCC, CellNumber::Whole, "Mobile Country Code", integer("%d"),
-     "ServingPLMN: Failed to retrieve MCC\n"},
-    {kVoxCellMonitorMNC, CellNumber::Whole, "Mobile Network Code", integer("%d"),
-     "ServingPLMN: Failed to retrieve MNC\n"},
-    {kVoxCellMonitorLAC, CellNumber::Whole, "Location Area Code", integer("%d"),
-     "ServingPLMN: Failed to retrieve LAC\n"},
+    {kVoxCellMonitorMCC,
+     CellNumber::Whole,
+     "Mobile Country Code",
+     integer("%d"),
+     "ServingPLMN: Failed to retrieve MCC\n",
+     {.role = Role::ServingCountryCode,
+      .digits = 3,
+      .identity = Identity::Location,
+      .clause = "3GPP TS 23.003 2.2"}},
+    {kVoxCellMonitorMNC,
+     CellNumber::Whole,
+     "Mobile Network Code",
+     integer("%d"),
+     "ServingPLMN: Failed to retrieve MNC\n",
+     {.role = Role::ServingNetworkCode,
+      .digits = 2,
+      .identity = Identity::Location,
+      .clause = "3GPP TS 23.003 2.2"}},
+    {kVoxCellMonitorLAC,
+     CellNumber::Whole,
+     "Location Area Code",
+     integer("%d"),
+     "ServingPLMN: Failed to retrieve LAC\n",
+     {.role = Role::ServingArea, .identity = Identity::Location, .clause = "3GPP TS 23.003 4.1"}},
 };
 
 constexpr CellKind cellKinds[] = {
@@ -72,8 +108,9 @@ constexpr CellKind cellKinds[] = {
     {kVoxCellMonitorRadioAccessTechnologyUMTS, kVoxCellMonitorCellTypeServing},
 };
 constexpr CellTable servingCell{cellKinds, CellTable::Shown::First, cellFields};
+constexpr Content identityContents[] = {countryCode, networkCode, areas};
 constexpr View sectionViews[] = {
-    {identityCode, areas.minimumLength},
+    {identityCode, areas.minimumLength, identityContents},
     {0x7132, selection},
     cellInformation,
 };

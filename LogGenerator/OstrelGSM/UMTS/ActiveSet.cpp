@@ -15,12 +15,33 @@ constexpr std::int64_t activeSet = 0;
 
 // Primary scrambling code (3GPP TS 25.213 5.2.2), CPICH RSCP and Ec/No (quantities of TS 25.215), both
 // computed from the modem's own scales.
-constexpr Field scramblingCode{"Scrambling Code", SearcherRecord::scramblingCode, integer("%d")};
+constexpr Field scramblingCode{"Scrambling Code",
+                               SearcherRecord::scramblingCode,
+                               integer("%d"),
+                               {.role = Role::ServingPhysicalCell, .clause = "3GPP TS 25.213 5.2.2"}};
 // A level, shown in dB on purpose.
-constexpr Field codePower{"RSCP", computed, integer("%d dB")};
-constexpr Field energyPerChip{"Energy Per Chip", computed, integer("%d dB")};
+constexpr Field codePower{"RSCP",
+                          computed,
+                          integer("%d dB"),
+                          {.role = Role::ServingLevel, .unit = Unit::DBm, .clause = "3GPP TS 25.215 5.1.1"}};
+constexpr Field energyPerChip{"Energy Per Chip",
+                              computed,
+                              integer("%d dB"),
+                              {.role = Role::ServingQuality, .clause = "3GPP TS 25.215 5.1.5"}};
+
+constexpr Content contents[] = {scramblingCode, codePower, energyPerChip};
+
+constexpr View sectionViews[] = {{SearcherRecord::code, SearcherRecord::minimumLength}};
 
 } // namespace
+
+std::span<const Content> ActiveSet::cellContents() const {
+    return contents;
+}
+
+std::span<const View> ActiveSet::views() const {
+    return sectionViews;
+}
 
 void ActiveSet::checkCells(const Record& record) const {
     // The measurements follow the cells: a complete one has its cell inside the record too.

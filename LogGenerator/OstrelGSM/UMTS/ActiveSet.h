@@ -11,13 +11,12 @@ namespace velmora {
 class ActiveSet final : public SearcherSet {
 public:
     [[nodiscard]] std::string_view getSectionName() const override { return "Active Set"; }
+    [[nodiscard]] std::span<const View> views() const override;
 
 protected:
     [[nodiscard]] std::string_view traceName() const override { return "ActiveSet"; }
     void checkCells(const Record& record) const override;
-    [[nodiscard]] std::size_t neededLength(const View& view, const Record& record) const override {
-        return Base::neededLength(view, record);
-    }
+    [[nodiscard]] std::span<const Content> cellContents() const override;
     void visitCells(const Record& record, FieldVisitor& visitor) const override;
 };
 

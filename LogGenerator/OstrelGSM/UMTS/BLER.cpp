@@ -16,18 +16,21 @@ constexpr Field windowFields[] = {
 constexpr Layout window = layout(16, windowFields); // the count at 13, the channels after it
 
 constexpr Field channelFields[] = {
-    {"Transport Channel ID", u8At(0), integer("%d")},
+    {"Transport Channel ID", u8At(0), integer("%d"), {.clause = "3GPP TS 25.302"}},
     {"CRC Received", i32At(1), integer("%d")},
     {"CRC Received in Error", i32At(5), integer("%d")},
 };
 constexpr Layout channel = layout(9, channelFields);
-constexpr List channelList{"Transport Channels"};
+constexpr Content channelContents[] = {channel};
+constexpr std::string_view channelKeys[] = {"Transport Channel ID"};
+constexpr List channelList{.label = "Transport Channels", .contents = channelContents, .keys = channelKeys};
+constexpr Content contents[] = {window, channelList};
 
 CountedList channels(const Record& record) {
     return CountedList(record, window.minimumLength, channel.minimumLength, record.u8(13));
 }
 
-constexpr View sectionViews[] = {{0x4116, window.minimumLength}};
+constexpr View sectionViews[] = {{0x4116, window.minimumLength, contents}};
 
 } // namespace
 

@@ -28,14 +28,18 @@ constexpr std::size_t primaryCountAt = 16;
 constexpr std::size_t secondaryCountAt = 17;
 
 constexpr Field processFields[] = {
-    {"Process ID", u8At(0), integer("%u")},
+    {"Process ID", u8At(0), integer("%u"), {.clause = "3GPP TS 25.321"}},
     {"No Rx Bits", u32At(1), integer("%u")},
     {"New Tx", u16At(5), integer("%u")},
     {"Block Errors", u16At(7), integer("%u")},
 };
 constexpr Layout process = layout(9, processFields);
-constexpr List primaryList{"Primary HARQ Process"};
-constexpr List secondaryList{"Secondary HARQ Process"};
+constexpr Content processContents[] = {process};
+constexpr std::string_view processKeys[] = {"Process ID"};
+constexpr List primaryList{.label = "Primary HARQ Process", .contents = processContents, .keys = processKeys};
+constexpr List secondaryList{
+    .label = "Secondary HARQ Process", .contents = processContents, .keys = processKeys};
+constexpr Content contents[] = {status, primaryList, secondaryList};
 // How far every primary process moves the secondary ones: not the nine bytes of its entry, on purpose.
 constexpr std::size_t primarySpan = 162;
 
@@ -48,7 +52,7 @@ CountedList secondaryProcesses(const Record& record) {
                        process.minimumLength, record.u8(secondaryCountAt));
 }
 
-constexpr View sectionViews[] = {{0x4221, status.minimumLength}};
+constexpr View sectionViews[] = {{0x4221, status.minimumLength, contents}};
 
 } // namespace
 

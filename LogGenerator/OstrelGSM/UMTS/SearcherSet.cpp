@@ -3,6 +3,7 @@
 
 #include "LogGenerator/OstrelGSM/UMTS/SearcherSet.h"
 
+#include "LogGenerator/Observations/ContentVisitor.h"
 #include "LogGenerator/OstrelGSM/UMTS/SearcherRecord.h"
 #include "Platform/SystemLog.h"
 
@@ -12,8 +13,9 @@ using OstrelGSM::SearcherRecord;
 
 namespace {
 
-constexpr View sectionViews[] = {{SearcherRecord::code, SearcherRecord::minimumLength}};
-constexpr List rows{};
+constexpr View sectionViews[] = {{SearcherRecord::code, SearcherRecord::minimumLength, 0}};
+constexpr std::string_view cellKeys[] = {"Scrambling Code"};
+constexpr List rows{.keys = cellKeys};
 
 } // namespace
 
@@ -35,12 +37,14 @@ void SearcherSet::decode(const View&, const Record& record, FieldVisitor& visito
     visitor.endList();
 }
 
-void SearcherSet::checkCells(const Record& record) const {
-    reportMissingEntries(SearcherRecord(record).cells(), SearcherRecord::code);
+void SearcherSet::describe(const View&, ContentVisitor& visitor) const {
+    visitor.beginList(rows);
+    visitor.contents(cellContents());
+    visitor.endList();
 }
 
-std::size_t SearcherSet::neededLength(const View&, const Record&) const {
-    return 0;
+void SearcherSet::checkCells(const Record& record) const {
+    reportMissingEntries(SearcherRecord(record).cells(), SearcherRecord::code);
 }
 
 void SearcherSet::visitCells(const Record&, FieldVisitor&) const {}

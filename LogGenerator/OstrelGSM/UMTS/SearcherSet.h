@@ -8,19 +8,21 @@
 namespace velmora {
 
 /// One of the UMTS searcher's four cell sets: a list that each record of the searcher replaces. A set that
-/// does not override `checkCells` and `visitCells` has no cells, whatever set a cell is of: its list is
-/// empty, on purpose.
+/// does not override `views`, `checkCells` and `visitCells` has no cells, whatever set a cell is of: its list
+/// is empty, on purpose.
 class SearcherSet : public Base {
 public:
-    [[nodiscard]] std::span<const View> views() const final;
+    [[nodiscard]] std::span<const View> views() const override;
     void decode(const View& view, const Record& record, FieldVisitor& visitor) const final;
+    void describe(const View& view, ContentVisitor& visitor) const final;
 
 protected:
     /// The set's name in the log.
     [[nodiscard]] virtual std::string_view traceName() const = 0;
     /// Logs what the record lacks.
     virtual void checkCells(const Record& record) const;
-    [[nodiscard]] std::size_t neededLength(const View& view, const Record& record) const override;
+    /// What a row may show.
+    [[nodiscard]] virtual std::span<const Content> cellContents() const { return {}; }
     /// Names the rows of the list.
     virtual void visitCells(const Record& record, FieldVisitor& visitor) const;
 

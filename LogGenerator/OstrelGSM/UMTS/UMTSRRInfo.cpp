@@ -20,7 +20,7 @@ constexpr EnumText rrcStateRows[] = {
 constexpr EnumTexts rrcStates(rrcStateRows, "Unknown");
 
 constexpr Field stateFields[] = {
-    {"RRC State", u8At(13), text(rrcStates)},
+    {"RRC State", u8At(13), text(rrcStates), {.role = Role::RadioState, .clause = "3GPP TS 25.331 7.1"}},
 };
 constexpr Layout state = layout(14, stateFields);
 
@@ -30,32 +30,53 @@ constexpr std::size_t powerMinimumLength = 16;
 constexpr std::size_t powerEntryLength = 14;
 constexpr Place powerTerm = i16At(4);
 static_assert(powerTerm.end() <= powerEntryLength);
-constexpr Field transmitPower{"Transmit Power", computed, real("%4.2lf dBm")};
+constexpr Field transmitPower{"Transmit Power", computed, real("%4.2lf dBm"), {.absent = " nan dBm"}};
 
 // 0x4127: cell identity and URA identity (3GPP TS 25.331 10.3.2.2, 10.3.2.6), UARFCN (TS 25.101 5.4.3).
 constexpr Field cellFields[] = {
-    {"Cell ID", i32At(21), integer("%d")},
-    {"Downlink Frequency", i32At(17), integer("%d")},
-    {"Uplink Frequency", i32At(13), integer("%d")},
-    {"URA ID", u16At(25), integer("%d")},
+    {"Cell ID",
+     i32At(21),
+     integer("%d"),
+     {.role = Role::ServingCell, .identity = Identity::Location, .clause = "3GPP TS 25.331 10.3.2.2"}},
+    {"Downlink Frequency",
+     i32At(17),
+     integer("%d"),
+     {.role = Role::ServingChannel, .clause = "3GPP TS 25.101 5.4.3"}},
+    {"Uplink Frequency", i32At(13), integer("%d"), {.clause = "3GPP TS 25.101 5.4.3"}},
+    {"URA ID",
+     u16At(25),
+     integer("%d"),
+     {.identity = Identity::Location, .clause = "3GPP TS 25.331 10.3.2.6"}},
 };
 constexpr Layout cell = layout(29, cellFields);
 constexpr std::uint32_t cellCode = 0x4127;
 
 // 0x4157: as the modem reports it.
 constexpr Field cipheringFields[] = {
-    {"Ciphering", u8At(13), flag("Enabled", "Disabled")},
+    {"Ciphering", u8At(13), flag("Enabled", "Disabled"), {.clause = "3GPP TS 33.102 6.6"}},
 };
 constexpr Layout ciphering = layout(19, cipheringFields);
 
 // As the telephony service reports it.
 constexpr CellField servingCellFields[] = {
-    {kVoxCellMonitorCellId, CellNumber::Whole, "Cell ID", integer("%d"),
-     "UMTSRRInfo: Failed to retrieve Cell ID\n"},
-    {kVoxCellMonitorUARFCN, CellNumber::Whole, "UARFCN", integer("%d"),
-     "UMTSRRInfo: Failed to retrieve UARFCN\n"},
-    {kVoxCellMonitorSCN, CellNumber::Whole, "Scrambling Code", integer("%d"),
-     "UMTSRRInfo: Failed to retrieve Scrambling Code\n"},
+    {kVoxCellMonitorCellId,
+     CellNumber::Whole,
+     "Cell ID",
+     integer("%d"),
+     "UMTSRRInfo: Failed to retrieve Cell ID\n",
+     {.role = Role::ServingCell, .identity = Identity::Location, .clause = "3GPP TS 25.331 10.3.2.2"}},
+    {kVoxCellMonitorUARFCN,
+     CellNumber::Whole,
+     "UARFCN",
+     integer("%d"),
+     "UMTSRRInfo: Failed to retrieve UARFCN\n",
+     {.role = Role::ServingChannel, .clause = "3GPP TS 25.101 5.4.3"}},
+    {kVoxCellMonitorSCN,
+     CellNumber::Whole,
+     "Scrambling Code",
+     integer("%d"),
+     "UMTSRRInfo: Failed to retrieve Scrambling Code\n",
+     {.role = Role::ServingPhysicalCell, .clause = "3GPP TS 25.213 5.2.2"}},
 };
 constexpr CellKind cellKinds[] = {
     {kVoxCellMonitorRadioAccessTechnologyUMTS, kVoxCellMonitorCellTypeServing},
@@ -83,8 +104,10 @@ double meanPower(const Record& record) {
     // in a sign that depends on the processor.
     return count != 0 ? static_cast<double>(sum) / count : std::numeric_limits<double>::quiet_NaN();
 }
+constexpr Content powerContents[] = {transmitPower};
 constexpr View sectionViews[] = {
-    {0x4125, state}, {powerCode, powerMinimumLength}, {cellCode, cell}, {0x4157, ciphering}, cellInformation,
+    {0x4125, state}, {powerCode, powerMinimumLength, powerContents}, {cellCode, cell}, {0x4157, ciphering},
+    cellInformation,
 };
 
 } // namespace

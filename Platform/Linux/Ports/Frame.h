@@ -52,7 +52,7 @@ using FrameHeaderBytes = std::array<std::uint8_t, frameHeaderSize>;
 /// Precondition: the payload is not above the maximum.
 [[nodiscard]] FrameHeaderBytes encodeFrameHeader(const Frame& frame);
 
-/// Precondition: `bytes` holds at least a header. The failure gives the found and the expected value.
+/// Precondition: `bytes` holds at least a header. The failure names the found and the expected value.
 Result<FrameHeader> decodeFrameHeader(Bytes bytes);
 
 } // namespace velmora

@@ -190,7 +190,7 @@ std::int32_t LinuxRemotePort::sendNow(const Frame& frame, Deadline deadline) {
         case FrameQueue::Flushed::WouldBlock:
             if (waitFor(_socket.get(), POLLOUT, deadline))
                 break;
-            // A frame that is partly written has to follow whole; its reply will be a late one.
+            // A frame that is partly written has to be completed; its reply will be a late one.
             if (queued)
                 _queue.removeNewest();
             _blocked = true;

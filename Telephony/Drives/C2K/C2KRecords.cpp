@@ -77,7 +77,7 @@ RecordBuilder evdoActiveSet(const std::vector<C2KPilot>& pilots) {
     RecordBuilder record(0x12B6, 25 + 12 * count);
     record.u8(15, static_cast<std::int64_t>(count));
     for (std::size_t i = 0; i < count; ++i) {
-        // Behind a pilot burst the whole sector is its pilot: C/I to C/(C + I).
+        // In a pilot burst the pilot has the sector's entire power: C/I to C/(C + I).
         const double ci = std::pow(10.0, pilots[i].ci_dB / 10);
         record.u16(25 + 12 * i, pilots[i].sector.pnOffset);
         record.u16(27 + 12 * i, units(10 * std::log10(ci / (1 + ci)), 512));

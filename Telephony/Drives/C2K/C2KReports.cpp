@@ -69,7 +69,7 @@ Report reverseRate(Context& context) {
     return reversePackets(second(context), context.reverse);
 }
 
-/// A record of the modem whose code no client asks for.
+/// A record of the modem whose code no client requests.
 Report foreignRecord(Context& context) {
     RecordBuilder record(0x1376, 13);
     for (std::size_t i = 0; i < 12; ++i)

@@ -24,7 +24,7 @@ std::vector<GSMMeasurement> gsmNeighbours(const Context& context, std::size_t li
     return neighbours;
 }
 
-/// A record of the modem whose code no client asks for.
+/// A record of the modem whose code no client requests.
 Report foreignRecord(Context& context) {
     RecordBuilder record(0x5226, 13);
     for (std::size_t i = 0; i < 12; ++i)

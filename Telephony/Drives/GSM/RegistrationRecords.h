@@ -10,7 +10,7 @@
 #include <vector>
 
 /// The records of registration and mobility management, one function a log code. The enumerators carry the
-/// numbers that stand in the records; only those that a scenario sends are listed.
+/// numbers in the records; only those that a scenario sends are listed.
 namespace velmora::records {
 
 enum class RegistrationState : std::uint8_t {

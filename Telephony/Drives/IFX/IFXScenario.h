@@ -11,8 +11,8 @@
 namespace velmora {
 
 /// A drive through the GSM cells of RadioNetwork, in the IFX technology: once a second the baseband sends its
-/// whole display as one property list, in the binary and the XML form alternately. What an engineer sees in a
-/// round of two and a half minutes:
+/// complete display as one property list, in the binary and the XML form alternately. What an engineer sees
+/// in a round of two and a half minutes:
 ///
 /// - Searching: neighbours alone. Then a serving cell in limited service, then registration.
 /// - Idle: identities, serving cell, six neighbours whose levels rise and fall; reselection to a neighbour
@@ -26,13 +26,17 @@ namespace velmora {
 /// technology's decoder ends the application where it cannot read one, or where one holds anything but
 /// dictionaries, arrays and strings.
 ///
-/// Everything depends only on the seed: the same seed gives the same bytes. Main thread only.
+/// Everything depends only on the seed: the same seed results in the same bytes. Main thread only.
 class IFXScenario final : public Scenario {
 public:
     explicit IFXScenario(std::uint64_t seed);
 
     [[nodiscard]] std::string_view technology() const override;
     [[nodiscard]] ScenarioEvent next() override;
+
+    /// What the last message was of: the phone and the cells around it.
+    [[nodiscard]] const IFXPhone& phone() const { return _phone; }
+    [[nodiscard]] const RadioNetwork& network() const { return _network; }
 
 private:
     void followTimeline();

@@ -14,7 +14,7 @@ namespace velmora {
 /// A carrier of the LTE network.
 struct LTECarrier {
     int band;
-    int downlink;        ///< EARFCN, inside the band with the whole bandwidth
+    int downlink;        ///< EARFCN, inside the band with the entire bandwidth
     int uplink;          ///< the EARFCN that belongs to it
     int resourceBlocks;  ///< bandwidth: 6, 15, 25, 50, 75 or 100
     double advantage_dB; ///< how much stronger it arrives than one at 1.8 GHz
@@ -44,7 +44,7 @@ struct LTEMeasurement {
     LTECell cell;
     double rsrp_dBm = -140; ///< -140 to -44
     double rsrq_dB = -19.5; ///< -19.5 to -3
-    double rssi_dBm = -110; ///< of the whole carrier
+    double rssi_dBm = -110; ///< of the entire carrier
 };
 
 /// The base stations of RadioNetwork with LTE on all sectors and all carriers, and the same car, which passes

@@ -61,7 +61,7 @@ struct ReselectionCandidate {
     int cell = 0; ///< physical cell id, primary scrambling code, BSIC or pilot offset
     int band = 0; ///< of GERAN and CDMA
 };
-/// 0xB186. The candidates' headers stand side by side, and only the last one has room after it for what
+/// 0xB186. The candidates' headers are adjacent, and only the last one has room after it for what
 /// belongs to its technology: a decoder that looks past an earlier header finds the next candidate's there.
 [[nodiscard]] RecordBuilder reselectionCandidates(const LTECell& serving,
                                                   const std::vector<ReselectionCandidate>& candidates);

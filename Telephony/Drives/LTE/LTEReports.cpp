@@ -77,7 +77,7 @@ Report cellArray(Context& context) {
     return cellInformation(cells, context.binary);
 }
 
-/// A record of the modem whose code no client asks for.
+/// A record of the modem whose code no client requests.
 Report foreignRecord(Context& context) {
     RecordBuilder record(0xB173, 13);
     for (std::size_t i = 0; i < 16; ++i)

@@ -169,7 +169,7 @@ void LTEScenario::addReports(DriveScript& due) {
 }
 
 UnusualMessageParts LTEScenario::unusualMessageParts(std::size_t number) {
-    // Which records are spoilt changes from round to round of the kinds of damage.
+    // Which records are damaged changes from round to round of the kinds of damage.
     const std::size_t round = number / allUnusualMessages.size();
     const LTEMeasurement serving = _phone.serving.value_or(LTEMeasurement{});
     RecordBuilder tooShort = records::lteServingCell(serving.cell);

@@ -51,7 +51,7 @@ double blockErrorRate(double sir_dB) {
     return std::clamp(std::pow(10.0, -2 - (sir_dB - 8) / 6), 0.0001, 1.0);
 }
 
-/// A record of the modem whose code no client asks for.
+/// A record of the modem whose code no client requests.
 Report foreign(Context& context) {
     RecordBuilder record(0xD0F1, 13);
     for (std::size_t i = 0; i < 12; ++i)

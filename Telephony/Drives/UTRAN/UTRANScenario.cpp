@@ -161,7 +161,7 @@ void UTRANScenario::addReports(DriveScript& due) {
 }
 
 UnusualMessageParts UTRANScenario::unusualMessageParts(std::size_t number) {
-    // Which records are spoilt changes from round to round of the kinds of damage.
+    // Which records are damaged changes from round to round of the kinds of damage.
     const std::size_t round = number / allUnusualMessages.size();
     RecordBuilder tooShort =
         round % 2 == 0 ? records::utranServingCell(_phone.serving ? _phone.serving->cell : UTRANCell{}, false)

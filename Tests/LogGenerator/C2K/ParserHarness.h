@@ -31,8 +31,8 @@ using LogLines = std::vector<CapturedLog::Line>;
 /// Every value key that a parser publishes.
 [[nodiscard]] const std::vector<std::string>& valueKeys();
 
-/// The parsers with a state and a display in which every value stands under its value key. The display is
-/// empty at first, so that values stand in it in publishing order.
+/// The parsers with a state and a display in which every value is under its value key. The display is
+/// empty at first, so that values are in publishing order.
 class ParserHarness {
 public:
     ParserHarness();
@@ -58,7 +58,7 @@ private:
     LogLines _lines;
 };
 
-/// One error line, as `lines` gives it.
+/// One error line, as `lines` returns it.
 [[nodiscard]] LogLines error(std::string text);
 
 /// The record with one byte changed. Precondition: the offset lies inside.

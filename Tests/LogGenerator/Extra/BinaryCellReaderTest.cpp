@@ -39,7 +39,7 @@ struct Form {
     std::size_t referenceWidth = 1;
     std::size_t root = 0;
     std::size_t padding = 0;     ///< between the objects and their table
-    std::size_t moreObjects = 0; ///< that the trailer announces
+    std::size_t moreObjects = 0; ///< in the trailer's count
     std::size_t firstOffset = 8;
 };
 
@@ -181,7 +181,7 @@ TEST(BinaryCellReaderTest, OffsetsAndReferencesAreOneOrTwoBytesWide) {
 }
 
 TEST(BinaryCellReaderTest, OffsetsOfThreeBytesAreNotTakenForLongerOnes) {
-    // Eight bytes from the table on are the number 8, where the empty array stands.
+    // Eight bytes from the table on are the number 8, where the empty array is.
     const char* const list = "62 70 6C 69 73 74 30 30 "  // "bplist00"
                              "A0 "                       // offset 8: an array of nothing
                              "00 00 00 "                 // the table: offset 0

@@ -180,7 +180,7 @@ TEST(CellListTest, ListOfMoreThanAMebibyteSaysTheSame) {
 }
 
 /// A list with one byte changed or its end cut off says the same whichever way it is read, also by a reader
-/// that has learnt from the whole one.
+/// that has learnt from the complete one.
 void expectSameOfEveryChange(const Bytes whole) {
     CellList list;
     const auto expectSame = [&list](Bytes bytes, std::size_t at) {

@@ -26,7 +26,7 @@ struct BitField {
 
 /// Fills a record or entry of `length` bytes with zeros and sets one field after the other to all ones and to
 /// one, then the other way round fills it with ones and sets each field to zero and to one: so each field's
-/// neighbouring bits are the opposite of its own. Expects what `show` then gives to be the row of all the
+/// neighbouring bits are the opposite of its own. Expects what `show` then returns to be the row of all the
 /// table's labels, of which only that field's (and those that share its bits) differ from the filling's.
 void expectBitFields(std::span<const BitField> table, std::size_t length,
                      const std::function<std::string(Bytes)>& show);

@@ -84,7 +84,7 @@ constexpr Scale scales[] = {
 TEST(ConnectedModeMeasurementMisc, ScalesLevelAndQuality) {
     for (const Scale& scale : scales) {
         SectionHarness section = inDictionary<ConnectedModeMeasurementMisc>();
-        // Level and quality stand side by side: the other's bits are the opposite.
+        // Level and quality are adjacent: the other's bits are the opposite.
         const auto notLow = static_cast<std::uint8_t>(~scale.low);
         const auto notHigh = static_cast<std::uint8_t>(~scale.high);
         section.update(recordWith(

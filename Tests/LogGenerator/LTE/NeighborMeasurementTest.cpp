@@ -146,7 +146,7 @@ TEST(NeighborCellsList, TracesTheCellsWithOneTextForFiveValues) {
                                          {warning, "Measured RSSI: -140.000000\n"},
                                          {warning, "Measured RSSI: -30.000000\n"},
                                          {warning, "Measured RSSI: -30.000000\n"}}));
-    // The number is that which is announced, and only cells that are there are traced.
+    // The number is the record's count, and only complete cells are traced.
     section.update(prefixOf(record(0xB180, twoCells), 21));
     EXPECT_EQ(section.lines(), (LogLines{{warning, "Neighbor Cells List"},
                                          {warning, "Number of neighboring cells being reported: 2\n"},

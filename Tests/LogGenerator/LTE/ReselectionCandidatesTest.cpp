@@ -16,7 +16,7 @@ namespace {
 using testing::ElementsAre;
 using testing::IsEmpty;
 
-/// A record that announces `count` candidates, and what follows the header.
+/// A record with a count of `count` candidates, and what follows the header.
 Data candidates(unsigned count, std::string_view bytes) {
     const std::uint8_t header[] = {0xEE,
                                    0xEE,
@@ -102,7 +102,7 @@ TEST(ReselectionCandidatesList, ShowsEachRATType) {
     }
 }
 
-/// One candidate of that type: what stands between its header and its fields, and the fields by their bits.
+/// One candidate of that type: what lies between its header and its fields, and the fields by their bits.
 void expectDetails(std::uint8_t type, std::span<const BitField> fields, std::size_t length) {
     expectBitFields(fields, length, [type](Bytes bytes) {
         SectionHarness section = inArray<ReselectionCandidatesList>();

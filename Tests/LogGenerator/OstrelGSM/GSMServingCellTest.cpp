@@ -32,7 +32,7 @@ TEST(GSMServingCell, ShowsTheIdentity) {
 TEST(GSMServingCell, ShowsLevelAndReselectionValuesUnsigned) {
     const Data levels = record(0x5137, R"(
         00 00
-        AB                              # level: 171 as it stands, neither signed nor offset
+        AB                              # level: 171, neither signed nor offset
         FE FF 01 00                     # C1: the low half alone, 65534
         10 27 FF FF                     # C2: 10000
         00 00 00 00

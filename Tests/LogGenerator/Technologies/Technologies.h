@@ -42,7 +42,7 @@ struct ExpectedSection {
     const char* name;
     const Base* (*field)(const ClassIndex& index);
     std::vector<std::uint32_t> codes; ///< in the order in which the section names them
-    CapturedLog::Line trace;          ///< the line that every record gives
+    CapturedLog::Line trace;          ///< the line that every record causes
 
     /// One whose line is a warning: `word`, or its name.
     ExpectedSection(const char* sectionName, const Base* (*inIndex)(const ClassIndex&),
@@ -56,7 +56,7 @@ struct ExpectedSection {
 [[nodiscard]] ExpectedSection simInfo(const Base* (*field)(const ClassIndex&));
 [[nodiscard]] ExpectedSection contextList(const Base* (*field)(const ClassIndex&));
 
-/// How many log lines a record of a code gives where its trace is not the only one.
+/// How many log lines a record of a code causes where its trace is not the only one.
 using LineCounts = std::map<std::uint32_t, testing::Matcher<std::size_t>>;
 
 /// A decoder of the technology's class; null where the other is of another class.

@@ -29,7 +29,7 @@ class TechnologyDecoderTest : public DecoderFixture, public testing::WithParamIn
 protected:
     TechnologyDecoderTest() : DecoderFixture(GetParam().templateName, GetParam().constant) {}
 
-    /// The lines that the sections give of each record under the code.
+    /// The lines that the sections log for each record under the code.
     [[nodiscard]] LogLines traces(std::uint32_t code) const {
         LogLines lines;
         for (const ExpectedSection& section : technology.subscribers(code))

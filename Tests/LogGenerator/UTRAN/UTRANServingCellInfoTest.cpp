@@ -166,7 +166,7 @@ TEST(UTRANServingCellInfo, WhatIsNoArrayOfCellsDoesNothing) {
 
 TEST(UTRANServingCellInfo, ARecordOfTheServiceThatIsCutOffDoesNothing) {
     const Data whole = cellInfo({cell("UTRAN", "Serving", {{"LAC", 1}})});
-    ASSERT_EQ(whole.bytes().back(), '\n'); // without this one byte it is still whole
+    ASSERT_EQ(whole.bytes().back(), '\n'); // without this one byte it is still complete
     for (std::size_t length = 0; length < whole.size() - 1; ++length) {
         SectionHarness section = make();
         section.update(prefixOf(whole, length), 0xFF0001);

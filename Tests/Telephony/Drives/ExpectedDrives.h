@@ -20,7 +20,7 @@
 
 namespace velmora {
 
-/// The odd messages of a drive whose records have tables.
+/// The unusual messages of a drive whose records have tables.
 struct ExpectedOddRecords {
     std::chrono::minutes length; ///< of the drive that is searched
     testing::Matcher<std::set<std::uint32_t>> shortCodes = testing::_;
@@ -40,7 +40,7 @@ struct ExpectedDrive {
     double mostRate;
     std::set<std::uint32_t> codes;
     RecordCheck good;
-    /// A number of a record that tells one drive from another; of most records none.
+    /// A number of a record in which drives differ; of most records none.
     std::function<std::optional<unsigned>(const LogMessage&)> trait;
     const Requirements* requirements = nullptr;
     ExpectedOddRecords odd = {};

@@ -18,7 +18,7 @@ namespace {
 
 using namespace std::chrono_literals;
 
-/// Ten minutes of seed 1: a whole round and most of the next.
+/// Ten minutes of seed 1: a complete round and most of the next.
 const Drive& tenMinutes() {
     static const Drive drive = driveOf<GSMScenario>(1, 10min);
     return drive;

@@ -110,7 +110,7 @@ TEST(LTEScenarioTest, servingCellsArePlausible) {
     });
     EXPECT_EQ(carriers.size(), 6U);
     EXPECT_GE(cells.size(), 12U) << "the cell changes on the way";
-    areas.erase(0); // of a spoilt record's
+    areas.erase(0); // of a damaged record
     EXPECT_EQ(areas, (std::set<unsigned>{7101, 7102, 8201}));
     std::set<unsigned> antennas;
     eachGood(0xB0C1, [&](Bytes r) { antennas.insert(r[20]); });

@@ -13,7 +13,7 @@
 #include <memory>
 #include <vector>
 
-/// What holds for every scenario. What is particular to one stands in its own file.
+/// What holds for every scenario. What is particular to one is in its own file.
 
 namespace velmora {
 namespace {

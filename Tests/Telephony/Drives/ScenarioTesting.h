@@ -59,7 +59,7 @@ struct RecordCensus {
     std::map<std::uint32_t, std::vector<Bytes>> belowMinimum;
     std::map<std::uint32_t, std::vector<Bytes>> overrun; ///< long enough, but not for their counts
 };
-/// Expects of every record, too, that its header tells its length.
+/// Expects of every record, too, that its header has its length.
 [[nodiscard]] RecordCensus censusOf(const Drive& drive, const Requirements& requirements);
 /// The codes of such a table.
 template <class Entry>

@@ -45,7 +45,7 @@ const Requirements requirements = {
 /// The requirements' codes.
 const std::set<std::uint32_t> codes = codesOf(requirements);
 
-/// Calls `look` with every whole record of that code.
+/// Calls `look` with every complete record of that code.
 void eachRecord(std::uint32_t code, const std::function<void(Bytes)>& look) {
     eachRecord(tenMinutes(), code, meets(requirements), look);
 }

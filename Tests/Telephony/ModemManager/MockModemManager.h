@@ -35,9 +35,9 @@ struct PreferredNetwork { // (su)
 };
 using PreferredNetworks = QList<PreferredNetwork>; // a(su)
 
-/// ModemManager as a test makes it up, in the test's own process: it has the objects, and gives the answers,
-/// that the test says, and keeps the calls that arrive. It behaves as ModemManager 1.20 does on the bus:
-/// modems are listed by the object manager, SIMs and bearers are not.
+/// ModemManager as a test makes it up, in the test's own process: it has the objects, and returns the
+/// replies, that the test says, and keeps the calls that arrive. It behaves as ModemManager 1.20 does on the
+/// bus: modems are listed by the object manager, SIMs and bearers are not.
 class MockModemManager final : public QDBusVirtualObject {
 public:
     /// A method's answer: values, or an error.

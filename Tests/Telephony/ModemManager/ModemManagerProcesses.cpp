@@ -53,7 +53,7 @@ std::unique_ptr<TestProcess> ModemManagerProcesses::watch() const {
 std::string ModemManagerProcesses::shown(const TestProcess& watcher, const std::vector<std::string>& texts) {
     std::string refresh;
     const bool there = eventually([&] {
-        // Refreshes are written whole.
+        // Each refresh is written at once.
         const std::string output = watcher.standardOutput();
         refresh =
             squeezed(std::string_view(output).substr(std::min(output.size(), output.rfind("Updated "))));

@@ -32,7 +32,7 @@ protected:
                 GTEST_SKIP() << "there is no " << needed;
     }
 
-    /// Starts responder and ModemManager and gives the one the other as its modem.
+    /// Starts the responder, and ModemManager with it as its modem.
     void startModem() {
         const std::string port = "abstract:velmora-test-" + std::to_string(::getpid());
         responder = start("/usr/bin/python3",

@@ -120,6 +120,29 @@ TEST_F(DecodeLinesTest, LinesOfAPipeComeWithEachRefresh) {
     EXPECT_EQ(process.output(), std::string("{") + firstRefresh + "\n{" + secondRefresh + "\n");
 }
 
+TEST_F(DecodeLinesTest, LinesOfAPipeComeWithEachMessage) {
+    const std::vector<std::uint64_t> offsets =
+        writeRecording("a.pcapng", "Ostrel_GSM", {{at(0), rrState(4)}, {at(10), rrState(5)}});
+    const std::string content = contentOf("a.pcapng");
+    ASSERT_EQ(::mkfifo(path("pipe").c_str(), 0600), 0);
+    for (const std::vector<std::string>& format :
+         {std::vector<std::string>{"--format", "jsonl"},
+          {"--format", "csv", "--select", "/GSM RR Info/RR State"}}) {
+        std::vector<std::string> arguments = {"decode", "--every", "message", path("pipe")};
+        arguments.insert(arguments.end(), format.begin(), format.end());
+        ToolProcess process(tool(arguments));
+        std::ofstream pipe(path("pipe"), std::ios::binary);
+        pipe << content.substr(0, offsets[1]) << std::flush;
+        // Nothing more comes before the line is out.
+        EXPECT_TRUE(process.waitFor("RR_PLMN_LIST_CONSTRUCTION"));
+        EXPECT_TRUE(process.waitFor("\n"));
+        pipe << content.substr(offsets[1]) << std::flush;
+        EXPECT_TRUE(process.waitFor("RR_IDLE"));
+        pipe.close();
+        EXPECT_EQ(process.exitStatus(), 0);
+    }
+}
+
 TEST_F(DecodeLinesTest, FullDiskIsReported) {
     writeDrive("a.pcapng");
     for (const std::vector<std::string>& format :

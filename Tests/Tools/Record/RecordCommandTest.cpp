@@ -5,6 +5,7 @@
 
 #include <gmock/gmock.h>
 
+#include <chrono>
 #include <csignal>
 #include <fstream>
 
@@ -69,6 +70,40 @@ TEST_F(RecordCommandTest, DurationEndsARecordingWithoutMessages) {
     EXPECT_EQ(process.exitStatus(), 0);
     EXPECT_EQ(ownMessages(process.errors()), "velmora-log: recorded 0 messages of Ostrel_GSM, 0 bytes\n");
     EXPECT_THAT(messagesOf("drive.pcapng", "Ostrel_GSM"), ElementsAre());
+}
+
+TEST_F(RecordCommandTest, APipeGetsEachMessageAsItArrives) {
+    startService();
+    ToolProcess process(tool({"record", "-"}));
+    ASSERT_TRUE(isStreaming());
+    const auto started = std::chrono::steady_clock::now();
+    for (std::uint8_t number = 0; number < 10; ++number) {
+        const std::string text = "message " + std::to_string(number);
+        _service->send(Data(std::vector<std::uint8_t>(text.begin(), text.end())));
+        ASSERT_TRUE(process.waitFor(text));
+    }
+    // A file gets them twice a second, which would be 5 s.
+    EXPECT_LT(std::chrono::steady_clock::now() - started, std::chrono::seconds(2));
+    process.signal(SIGINT);
+    EXPECT_EQ(process.exitStatus(), 0);
+}
+
+TEST_F(RecordCommandTest, WithoutAServiceItEndsAfterItsTimeout) {
+    ToolProcess process(tool({"record", "--timeout", "0.3", path("drive.pcapng")}));
+    EXPECT_EQ(process.exitStatus(), 1);
+    EXPECT_EQ(ownMessages(process.errors()),
+              "velmora-log: no telephony service answers; retrying\n"
+              "velmora-log: nothing was recorded: no telephony service answers after 0.3 s; start one with "
+              "velmora-telephonyd --source modemmanager (the modem) or velmora-telephonyd --source "
+              "scenario:gsm,seed=1 (a synthetic drive)\n");
+    EXPECT_FALSE(exists("drive.pcapng"));
+}
+
+TEST_F(RecordCommandTest, ATimeoutDoesNotEndARecordingThatHasBegun) {
+    startService();
+    ToolProcess process(tool({"record", "--timeout", "0.3", "--duration", "0.6", path("drive.pcapng")}));
+    EXPECT_EQ(process.exitStatus(), 0);
+    EXPECT_EQ(ownMessages(process.errors()), "velmora-log: recorded 0 messages of Ostrel_GSM, 0 bytes\n");
 }
 
 TEST_F(RecordCommandTest, WithoutAServiceNoFileIsLeft) {

@@ -82,5 +82,20 @@ TEST(TerminalFrameTest, KeysScrollWithinTheRows) {
         EXPECT_EQ(scrolledBy(row.key, row.from, layout), row.to);
 }
 
+TEST(AdviceRowsTest, BreaksAtBlanks) {
+    const auto texts = [](std::string_view text, std::size_t columns) {
+        std::vector<std::string> rows;
+        for (const TreeRow& row : adviceRows(text, columns))
+            rows.push_back(row.text);
+        return rows;
+    };
+    using Rows = std::vector<std::string>;
+    EXPECT_EQ(texts("start one with it", 9), (Rows{"start one", "with it"}));
+    EXPECT_EQ(texts("start one with it", 8), (Rows{"start", "one with", "it"}));
+    EXPECT_EQ(texts("start one", 80), (Rows{"start one"}));
+    EXPECT_EQ(texts("longword", 3), (Rows{"lon", "gwo", "rd"}));
+    EXPECT_EQ(texts("", 3), Rows());
+}
+
 } // namespace
 } // namespace velmora

@@ -8,6 +8,7 @@
 
 #include <chrono>
 #include <csignal>
+#include <filesystem>
 #include <optional>
 #include <regex>
 
@@ -23,6 +24,10 @@ using testing::StartsWith;
 
 constexpr const char* enterScreen = "\x1b[?1049h\x1b[?25l";
 constexpr const char* leaveScreen = "\x1b[?25h\x1b[?1049l";
+
+const std::string noService =
+    "velmora-log: no telephony service answers; start one with velmora-telephonyd --source modemmanager (the "
+    "modem) or velmora-telephonyd --source scenario:gsm,seed=1 (a synthetic drive)\n";
 
 /// The text with every status line's time as "TIME".
 std::string withoutTimes(const std::string& text) {
@@ -120,6 +125,7 @@ TEST_F(WatchCommandTest, WithoutAServiceItWaits) {
     process.signal(SIGTERM);
     EXPECT_EQ(process.exitStatus(), 0);
     EXPECT_EQ(process.output(), "Connecting...\n");
+    EXPECT_EQ(ownMessages(process.errors()), noService);
     EXPECT_THAT(portFiles(), ElementsAre());
 }
 
@@ -139,6 +145,52 @@ TEST_F(WatchCommandTest, OncePrintsTheFirstRefreshAndEnds) {
                                               "SIM Info\n");
 }
 
+TEST_F(WatchCommandTest, OnceEndsAfterItsTimeoutWithoutAService) {
+    ToolProcess process(tool({"watch", "--once", "--timeout", "0.3"}));
+    EXPECT_EQ(process.exitStatus(), 1);
+    EXPECT_EQ(process.output(), "");
+    EXPECT_THAT(process.errors(),
+                HasSubstr("velmora-log: no telephony service answers after 0.3 s; start one with "
+                          "velmora-telephonyd --source "));
+}
+
+TEST_F(WatchCommandTest, OnceEndsAfterItsTimeoutWithoutAMessage) {
+    startService();
+    ToolProcess process(tool({"watch", "--once", "--timeout", "0.5"}));
+    EXPECT_EQ(process.exitStatus(), 1);
+    EXPECT_EQ(process.output(), "");
+    EXPECT_EQ(ownMessages(process.errors()),
+              "velmora-log: the telephony service has sent nothing after 0.5 s\n");
+}
+
+TEST_F(WatchCommandTest, OnceWithARefreshInTimeIsNoError) {
+    startService();
+    ToolProcess process(tool({"watch", "--once", "--timeout", "30"}));
+    ASSERT_TRUE(isStreaming());
+    sendBand("GSM 900");
+    EXPECT_EQ(process.exitStatus(), 0);
+    EXPECT_THAT(process.output(), EndsWith("Band  GSM 900\n"));
+}
+
+TEST_F(WatchCommandTest, AnUnusablePortDirectoryIsReported) {
+    std::filesystem::permissions(_directory / "ports", std::filesystem::perms::all);
+    ToolProcess process(tool({"watch", "--once", "--timeout", "0.3"}));
+    EXPECT_EQ(process.exitStatus(), 1);
+    const std::string problem =
+        "velmora-log: port directory " + path("ports") + " has mode 0777, wanted 0700";
+    EXPECT_EQ(ownMessages(process.errors()), problem + "\n" + problem + " after 0.3 s\n");
+}
+
+TEST_F(WatchCommandTest, ATechnologyWithoutADecoderIsReported) {
+    startService("Ostrel_NR");
+    ToolProcess process(tool({"watch"}));
+    EXPECT_TRUE(process.waitForError(
+        "velmora-log: the telephony service's technology Ostrel_NR has no decoder here, wanted one of IFX, "
+        "Ostrel_GSM, Ostrel_CDMA, Ostrel_LTE, Ostrel_UTRAN2\n"));
+    process.signal(SIGINT);
+    EXPECT_EQ(process.exitStatus(), 0);
+}
+
 TEST_F(WatchCommandTest, ClosedPipeEndsItQuietlyWithoutARefresh) {
     startService();
     ToolProcess process(tool({"watch"}));
@@ -154,7 +206,7 @@ TEST_F(WatchCommandTest, FullDiskIsReported) {
     ToolProcess process(setup);
     EXPECT_EQ(process.exitStatus(), 1);
     EXPECT_EQ(ownMessages(process.errors()),
-              "velmora-log: cannot write standard output: No space left on device\n");
+              noService + "velmora-log: cannot write standard output: No space left on device\n");
 }
 
 TEST_F(WatchCommandTest, DecoderLinesAreSummedUpWhenItEnds) {
@@ -289,6 +341,26 @@ TEST_F(WatchTerminalTest, FollowsTheSizeOfTheWindow) {
               "Row 3   a value that leaves no room for a s…\r\n"
               "Row 4   a value that leaves no room for a s…\r\n"
               "\x1b[7mUpdated TIME        1-5/40\x1b[0m");
+}
+
+TEST_F(WatchTerminalTest, TheScreenSaysWhatIsWrongAndWhatToStart) {
+    ToolProcess process(onTerminal({"watch"}));
+    ASSERT_TRUE(process.waitFor("Connecting... no telephony service answers"));
+    EXPECT_THAT(process.output(), HasSubstr("\x1b[Hstart one with velmora-telephonyd --source modemmanager"));
+    EXPECT_THAT(process.output(), HasSubstr("scenario:gsm,seed=1 (a\r\r\nsynthetic drive)"));
+    startService();
+    ASSERT_TRUE(isStreaming());
+    sendRows();
+    const auto refreshed = process.waitFor("1-11/40\x1b[0m");
+    ASSERT_TRUE(refreshed);
+    EXPECT_THAT(process.output().substr(process.output().rfind("\x1b[7m", *refreshed)),
+                StartsWith("\x1b[7mUpdated "));
+    // The rows stay when the service goes.
+    _service.reset();
+    ASSERT_TRUE(process.waitFor("Connecting... no telephony service answers", *refreshed));
+    EXPECT_THAT(process.output().substr(process.output().rfind("\x1b[H")), StartsWith("\x1b[HRow 0 "));
+    process.type("q");
+    EXPECT_EQ(process.exitStatus(), 0);
 }
 
 TEST_F(WatchTerminalTest, EndsWithTheSignalsOfAUser) {

@@ -47,7 +47,7 @@ public:
     /// In the viewport.
     [[nodiscard]] QRect rowRect(std::size_t row) const;
     [[nodiscard]] std::optional<std::size_t> rowAt(const QPoint& place) const;
-    /// How many whole rows the viewport has room for, at least 1.
+    /// How many complete rows the viewport has room for, at least 1.
     [[nodiscard]] std::size_t rowsPerPage() const;
 
     [[nodiscard]] std::optional<std::size_t> selectedRow() const { return _selected; }

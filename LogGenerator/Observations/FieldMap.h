@@ -1,0 +1,62 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include "LogGenerator/Observations/Catalogue.h"
+
+#include <cstddef>
+#include <span>
+#include <string>
+#include <vector>
+
+namespace velmora {
+
+/// Where a section's fields and lists are in the catalogue.
+class FieldMap {
+public:
+    /// A field in a list (null: in none) and a leaf that shows it.
+    struct Entry {
+        const List* list;
+        const Field* field;
+        Catalogue::Node* node;
+        const CatalogueSource* source;
+        ObservedKind kind;
+        double scale; ///< physical value = shown value * scale + offset
+        double offset;
+    };
+    /// A list and a place that shows it.
+    struct ListEntry {
+        const List* outer;
+        const List* list;
+        Catalogue::Node* node;
+    };
+
+    FieldMap() = default;
+    FieldMap(Catalogue& catalogue, std::string section)
+        : _catalogue(&catalogue), _section(std::move(section)) {}
+
+    [[nodiscard]] Catalogue& catalogue() const { return *_catalogue; }
+    [[nodiscard]] const std::string& section() const { return _section; }
+
+    void add(const Entry& entry) { _entries.push_back(entry); }
+    void add(const ListEntry& entry) { _lists.push_back(entry); }
+    /// Call it when all have been added, before anything is looked up.
+    void sort();
+
+    /// The leaves that show the field; most have one. Fields are looked up fastest in the order of their
+    /// tables.
+    [[nodiscard]] std::span<const Entry> find(const List* list, const Field& field) const;
+    /// The leaf of that label in the section's own dictionary; null for none.
+    [[nodiscard]] const CatalogueField* leafOf(std::string_view label) const;
+    [[nodiscard]] std::span<const ListEntry> findList(const List* outer, const List& list) const;
+
+private:
+    Catalogue* _catalogue = nullptr;
+    std::string _section;
+    std::vector<Entry> _entries; ///< by list and field
+    std::vector<ListEntry> _lists;
+    mutable std::size_t _expected = 0; ///< the entry that follows the one found last
+};
+
+} // namespace velmora

@@ -1,0 +1,354 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
+#include "LogGenerator/Observations/Observer.h"
+
+#include "LogGenerator/Observations/TextNumber.h"
+#include "Platform/DateText.h"
+#include "PropertyLists/Value.h"
+
+#include <algorithm>
+#include <cmath>
+
+namespace velmora {
+
+namespace {
+
+constexpr std::int64_t largestCode = 999; ///< of a mobile country or network code (3GPP TS 23.003 2.2)
+
+bool areDigits(std::string_view text) {
+    return std::all_of(text.begin(), text.end(), [](char c) { return c >= '0' && c <= '9'; });
+}
+
+std::string_view withoutBlanks(std::string_view text) {
+    const std::size_t first = text.find_first_not_of(' ');
+    if (first == std::string_view::npos)
+        return {};
+    return text.substr(first, text.find_last_not_of(' ') + 1 - first);
+}
+
+/// The raw value with the sign that it means.
+std::int64_t signedAsMeant(const Field& field, std::int64_t raw) {
+    const std::uint8_t width = field.place.width;
+    if (field.means.sign == Sign::AsShown || width == 0)
+        return raw;
+    const std::int64_t range = std::int64_t{1} << width;
+    const std::int64_t unsignedRaw = raw & (range - 1);
+    return field.means.sign == Sign::Signed && unsignedRaw >= range / 2 ? unsignedRaw - range : unsignedRaw;
+}
+
+/// The number that the field's format shows, but with the sign that it means.
+double shownNumber(const Field& field, std::int64_t raw) {
+    const TextFormat& format = field.format;
+    const std::int64_t meant = signedAsMeant(field, raw);
+    switch (format.kind) {
+    case TextFormat::Kind::Integer: {
+        const std::int64_t shown =
+            meant * static_cast<std::int64_t>(format.scale) + static_cast<std::int64_t>(format.offset);
+        if (field.means.sign != Sign::AsShown)
+            return static_cast<double>(shown);
+        // An integer is shown in 32 bits, whatever the record holds.
+        return format.format.conversion == 'u' ? static_cast<double>(static_cast<std::uint32_t>(shown))
+                                               : static_cast<double>(static_cast<std::int32_t>(shown));
+    }
+    case TextFormat::Kind::Real: return static_cast<double>(meant) * format.scale + format.offset;
+    case TextFormat::Kind::Hexadecimal: return static_cast<double>(static_cast<std::uint32_t>(meant));
+    default: return static_cast<double>(meant);
+    }
+}
+
+/// The unit that the leaf's texts show.
+Unit textUnit(const CatalogueField& leaf) {
+    if (leaf.sources.empty())
+        return leaf.unit;
+    return unitOfSuffix(leaf.sources.front().field->format.format.suffix).value_or(ShownUnit()).unit;
+}
+
+} // namespace
+
+void Observer::beginMessage() {
+    ++_messages;
+    _map = nullptr;
+    _sections.clear();
+    _observations.clear();
+    _lists.clear();
+    _removed.clear();
+    _levels.clear();
+    _texts.clear();
+    _usedRows = 0;
+    _row = nullptr;
+}
+
+bool Observer::beginSection(const FieldMap& map, std::uint32_t code) {
+    const std::pair section(&map, code);
+    if (std::find(_sections.begin(), _sections.end(), section) != _sections.end())
+        return false;
+    _sections.push_back(section);
+    _map = &map;
+    _code = code;
+    return true;
+}
+
+ObservedMessage Observer::message(Time arrival, std::optional<std::uint32_t> code,
+                                  std::optional<std::uint64_t> timestamp) const {
+    return {_messages, arrival, code, timestamp, _observations, _lists, _removed};
+}
+
+Observation& Observer::add(const CatalogueField& leaf, const CatalogueSource* source) {
+    Observation& observation = _observations.emplace_back();
+    observation.leaf = &leaf;
+    observation.source = source;
+    if (_row)
+        observation.rows = *_row;
+    if (!_levels.empty())
+        observation.rowKey = _levels.back().numberKey;
+    return observation;
+}
+
+template <class Observe>
+void Observer::forEachLeaf(const Field& field, Observe observe) {
+    beginValue();
+    for (const FieldMap::Entry& entry : _map->find(currentList(), field))
+        if (entry.source->code == _code)
+            observe(entry, add(*entry.node->leaf(), entry.source));
+}
+
+void Observer::fields(const Record& record, const Layout& layout) {
+    for (const Field& field : layout.fields)
+        number(field, field.place.read(record));
+}
+
+void Observer::number(const Field& field, std::int64_t raw) {
+    forEachLeaf(field, [&](const FieldMap::Entry& entry, Observation& observation) {
+        observation.text = Observation::Text::OfRaw;
+        observation.raw = raw;
+        if (field.format.hasSpecial && raw == field.format.specialValue)
+            return; // absent
+        observation.kind = entry.kind;
+        if (entry.kind == ObservedKind::Number) {
+            observation.number = shownNumber(field, raw) * entry.scale + entry.offset;
+        } else if (entry.kind == ObservedKind::Text) {
+            std::string& digits = _texts.add();
+            if (raw >= 0 && raw <= largestCode)
+                digits = std::to_string(raw);
+            if (!digits.empty() && digits.size() < field.means.digits)
+                digits.insert(0, field.means.digits - digits.size(), '0');
+            setCode(field, digits, observation);
+        }
+    });
+}
+
+void Observer::real(const Field& field, double value) {
+    forEachLeaf(field, [&](const FieldMap::Entry& entry, Observation& observation) {
+        observation.text = Observation::Text::OfReal;
+        observation.shown = value;
+        if (!std::isfinite(value))
+            return; // absent
+        observation.kind = entry.kind;
+        observation.number = value * entry.scale + entry.offset;
+    });
+}
+
+void Observer::text(const Field& field, std::string_view text) {
+    const std::string_view kept = _texts.copy(text);
+    forEachLeaf(field, [&](const FieldMap::Entry& entry, Observation& observation) {
+        observation.given = kept;
+        if (entry.kind != ObservedKind::Text)
+            return; // a text in place of the value
+        if (field.means.digits != 0) {
+            setCode(field, withoutBlanks(kept), observation);
+            return;
+        }
+        observation.kind = ObservedKind::Text;
+        observation.words = kept;
+    });
+}
+
+void Observer::setCode(const Field& field, std::string_view digits, Observation& observation) const {
+    const bool isCode = digits.size() >= field.means.digits && areDigits(digits);
+    observation.kind = isCode ? ObservedKind::Text : ObservedKind::Absent;
+    observation.words = isCode ? digits : std::string_view();
+}
+
+void Observer::supplied(const Field& field, const Value& value) {
+    beginValue();
+    for (const FieldMap::Entry& entry : _map->find(currentList(), field)) {
+        if (entry.source->code != _code)
+            continue;
+        const std::size_t first = _observations.size();
+        if (value.asDictionary() || value.asArray()) {
+            tree(_map->catalogue(), *entry.node, _map->section(), value);
+            setKey(first, entry.node->keys());
+        } else {
+            leaf(*entry.node->leaf(), value);
+        }
+        if (_levels.empty()) // the rows of a list go with the list
+            removeOthers(*entry.node, first);
+    }
+}
+
+void Observer::removeOthers(const Catalogue::Node& node, std::size_t first) {
+    const auto shown = _observations.begin() + static_cast<std::ptrdiff_t>(first);
+    const CatalogueField* const leaf = node.leaf();
+    const auto isLeaf = [leaf](const Observation& each) { return each.leaf == leaf; };
+    if (leaf && std::none_of(shown, _observations.end(), isLeaf))
+        _removed.push_back(leaf);
+    for (const std::unique_ptr<Catalogue::Node>& child : node.children())
+        removeOthers(*child, first);
+}
+
+void Observer::display(Catalogue& catalogue, const Value& value) {
+    tree(catalogue, catalogue.root(), {}, value);
+    _displayed.assign(catalogue.fields().size(), false);
+    for (const Observation& each : _observations)
+        _displayed[each.leaf->index] = true;
+    for (std::size_t i = 0; i < _displayedBefore.size(); ++i)
+        if (_displayedBefore[i] && !_displayed[i])
+            _removed.push_back(&catalogue.fields()[i]);
+    std::swap(_displayed, _displayedBefore);
+}
+
+void Observer::leaf(const CatalogueField& leaf, const Value& value) {
+    Observation& observation = add(leaf, leaf.sources.empty() ? nullptr : &leaf.sources.front());
+    if (const std::string* const text = value.asString()) {
+        observation.given = _texts.copy(*text);
+        if (!leaf.isReadFromText) {
+            observation.kind = ObservedKind::Text;
+            observation.words = observation.given;
+        } else if (const std::optional<TextNumber> number = readTextNumber(*text);
+                   number && number->unit == textUnit(leaf)) {
+            observation.kind = ObservedKind::Number;
+            observation.number = number->value;
+        }
+    } else if (const std::int64_t* const integer = value.asInteger()) {
+        observation.kind = ObservedKind::Number;
+        observation.number = static_cast<double>(*integer);
+        observation.given = _texts.add() = std::to_string(*integer);
+    } else if (const double* const number = value.asReal()) {
+        observation.given = _texts.add() = std::to_string(*number);
+        if (!std::isfinite(*number))
+            return; // absent
+        observation.kind = ObservedKind::Number;
+        observation.number = *number;
+    } else if (const bool* const flag = value.asBoolean()) {
+        observation.kind = ObservedKind::Flag;
+        observation.raw = *flag ? 1 : 0;
+        observation.given = *flag ? "true" : "false";
+    } else if (const Date* const date = value.asDate()) {
+        observation.kind = ObservedKind::Text;
+        observation.given = _texts.add() = dateAndTimeText(*date, " ");
+        observation.words = observation.given;
+    } else if (const Data* const data = value.asData()) {
+        observation.kind = ObservedKind::Binary;
+        observation.bytes = data->bytes();
+    }
+}
+
+void Observer::tree(Catalogue& catalogue, Catalogue::Node& node, std::string_view section,
+                    const Value& value) {
+    if (const Dictionary* const dictionary = value.asDictionary()) {
+        for (const auto& [key, child] : *dictionary)
+            tree(catalogue, node.child(key), section, child);
+    } else if (const Array* const array = value.asArray()) {
+        _lists.push_back({&node, static_cast<std::uint32_t>(array->size())});
+        const RowNumbers* const outer = _row;
+        for (std::size_t i = 0; i < array->size(); ++i) {
+            _row = outer;
+            newRow(static_cast<std::uint32_t>(i));
+            const std::size_t first = _observations.size();
+            tree(catalogue, node.rows(), section, (*array)[i]);
+            setKey(first, node.rows().keys());
+        }
+        _row = outer;
+    } else if (!value.isNone()) {
+        const bool isNew = !node.leaf();
+        CatalogueField& shown = catalogue.leafAt(node, section);
+        if (isNew && catalogue.readsNumbersFromTexts())
+            if (const std::string* const text = value.asString())
+                if (const std::optional<TextNumber> number = readTextNumber(*text)) {
+                    shown.isReadFromText = true;
+                    shown.kind = ObservedKind::Number;
+                    shown.unit = number->unit;
+                }
+        leaf(shown, value);
+    }
+}
+
+void Observer::removed(std::string_view label) {
+    if (const CatalogueField* const leaf = _map->leafOf(label))
+        _removed.push_back(leaf);
+}
+
+void Observer::newRow(std::uint32_t number) {
+    if (_usedRows == _rows.size())
+        _rows.emplace_back();
+    RowNumbers& row = _rows[_usedRows++];
+    row.clear();
+    if (_row)
+        row.assign(_row->begin(), _row->end());
+    row.push_back(number);
+    _row = &row;
+}
+
+void Observer::beginList(const List& list) {
+    _levels.push_back({&list, _row});
+}
+
+void Observer::beginValue() {
+    if (_levels.empty() || _levels.back().list->entries != List::Entries::Values)
+        return;
+    Level& level = _levels.back();
+    _row = level.outerRow;
+    newRow(level.next++);
+}
+
+void Observer::beginRow() {
+    Level& level = _levels.back();
+    _row = level.outerRow;
+    newRow(level.next++);
+    level.firstOfRow = _observations.size();
+}
+
+void Observer::endRow() {
+    const Level& level = _levels.back();
+    _row = level.outerRow;
+    setKey(level.firstOfRow, level.list->keys);
+}
+
+void Observer::setKey(std::size_t first, std::span<const std::string_view> names) {
+    if (names.empty() || first == _observations.size())
+        return;
+    const std::span<Observation> row(&_observations[first], _observations.size() - first);
+    const std::size_t depth = row.front().rows.size();
+    std::string& key = _texts.add();
+    for (const std::string_view name : names)
+        for (const Observation& each : row)
+            if (each.rows.size() == depth && each.leaf->node->name() == name) {
+                key += key.empty() ? "" : "/";
+                key += _keyText.of(each);
+                break;
+            }
+    for (Observation& each : row)
+        each.rowKey = key;
+}
+
+void Observer::entryNumber(std::size_t, std::uint16_t number) {
+    Level& level = _levels.back();
+    _row = level.outerRow;
+    newRow(number);
+    ++level.next;
+    level.numberKey = _texts.add() = std::to_string(number);
+}
+
+void Observer::endList() {
+    const Level level = _levels.back();
+    _levels.pop_back();
+    _row = level.outerRow;
+    for (const FieldMap::ListEntry& entry : _map->findList(currentList(), *level.list)) {
+        _lists.push_back({entry.node, level.next});
+        if (level.next == 0 && !level.list->whenEmpty.empty())
+            add(*entry.node->leaf(), nullptr).given = level.list->whenEmpty;
+    }
+}
+
+} // namespace velmora

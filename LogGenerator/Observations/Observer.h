@@ -1,0 +1,98 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include "LogGenerator/Fields/FieldVisitor.h"
+#include "LogGenerator/Observations/FieldMap.h"
+#include "LogGenerator/Observations/Observation.h"
+#include "LogGenerator/Observations/TextArena.h"
+
+#include <cstddef>
+#include <cstdint>
+#include <deque>
+#include <optional>
+#include <string_view>
+#include <utility>
+#include <vector>
+
+namespace velmora {
+
+class Dictionary;
+
+/// Gathers what the decode functions name of a message as observations. Once messages repeat, it allocates
+/// nothing. What a map does not have, since the display has no place for it, is not observed.
+class Observer final : public FieldVisitor {
+public:
+    /// A message begins; what was observed of the earlier one is gone.
+    void beginMessage();
+    /// The fields of a section follow, from a record of that code. False where the section has named that
+    /// record's fields already: a code that is subscribed twice is observed once.
+    [[nodiscard]] bool beginSection(const FieldMap& map, std::uint32_t code);
+    /// All of the message, as it arrived at that time.
+    [[nodiscard]] ObservedMessage message(Time arrival, std::optional<std::uint32_t> code,
+                                          std::optional<std::uint64_t> timestamp) const;
+
+    /// The leaves of a property list that is shown at the node.
+    void tree(Catalogue& catalogue, Catalogue::Node& node, std::string_view section, const Value& value);
+
+    /// The same of the entire display: what an earlier one had and this one has not is removed.
+    void display(Catalogue& catalogue, const Value& value);
+
+    void fields(const Record& record, const Layout& layout) override;
+    void number(const Field& field, std::int64_t raw) override;
+    void real(const Field& field, double value) override;
+    void text(const Field& field, std::string_view text) override;
+    void supplied(const Field& field, const Value& value) override;
+    void removed(std::string_view label) override;
+
+    void beginList(const List& list) override;
+    void beginRow() override;
+    void endRow() override;
+    void entryNumber(std::size_t index, std::uint16_t number) override;
+    void endList() override;
+
+private:
+    using RowNumbers = std::vector<std::uint32_t>;
+    struct Level {
+        const List* list;
+        const RowNumbers* outerRow;      ///< that the list is in; null for none
+        std::uint32_t next = 0;          ///< the index of the next entry
+        std::size_t firstOfRow = 0;      ///< the first observation of the row
+        std::string_view numberKey = {}; ///< of the entry in a numbered list
+    };
+
+    [[nodiscard]] const List* currentList() const { return _levels.empty() ? nullptr : _levels.back().list; }
+    /// Calls `observe(entry, observation)` for each leaf that shows the field.
+    template <class Observe>
+    void forEachLeaf(const Field& field, Observe observe);
+    Observation& add(const CatalogueField& leaf, const CatalogueSource* source);
+    void setCode(const Field& field, std::string_view digits, Observation& observation) const;
+    /// Sets what identifies the row of the observations from `first` on, by the leaves of these names.
+    void setKey(std::size_t first, std::span<const std::string_view> names);
+    /// The leaves at the node and below it that none of the observations from that one on is of show nothing
+    /// any more.
+    void removeOthers(const Catalogue::Node& node, std::size_t first);
+    /// A value of a list without rows begins.
+    void beginValue();
+    void newRow(std::uint32_t number);
+    void leaf(const CatalogueField& leaf, const Value& value);
+
+    std::uint64_t _messages = 0;
+    const FieldMap* _map = nullptr;
+    std::uint32_t _code = 0; ///< of the record whose fields are named
+    std::vector<std::pair<const FieldMap*, std::uint32_t>> _sections; ///< of this message
+    std::vector<Observation> _observations;
+    std::vector<ObservedList> _lists;
+    std::vector<const CatalogueField*> _removed;
+    std::vector<bool> _displayed; ///< by index in the catalogue, see `display`
+    std::vector<bool> _displayedBefore;
+    std::vector<Level> _levels;
+    TextArena _texts;
+    ObservedText _keyText;
+    std::deque<RowNumbers> _rows; ///< the numbers of each row, a storage that is used again
+    std::size_t _usedRows = 0;
+    const RowNumbers* _row = nullptr; ///< the current one; null outside of lists
+};
+
+} // namespace velmora

@@ -1,0 +1,57 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include "Model/VelmoraModel.h"
+#include "Tools/Log/DecoderLog.h"
+
+#include <functional>
+#include <memory>
+#include <string>
+#include <string_view>
+#include <utility>
+
+namespace velmora {
+
+/// A model that reports the technology that the service names. A model's display is that of the first
+/// technology and stays so; another technology takes another model.
+class WatchModel final : public VelmoraModel {
+public:
+    struct Events {
+        std::function<void(std::string_view technology)> changed;
+        std::function<void(std::string_view technology)> unknown; ///< there is no decoder for it
+    };
+
+    WatchModel(ModelPlatform platform, ModelObserver* observer, DecoderLines& lines, Events events)
+        : VelmoraModel(std::move(platform), observer), _lines(lines), _events(std::move(events)) {}
+
+    void updateWithData(const Data& data) override {
+        const DecoderLog log(_lines);
+        VelmoraModel::updateWithData(data);
+    }
+
+protected:
+    [[nodiscard]] std::unique_ptr<LogGenerator>
+    generatorFromTechnology(std::string_view technology) override {
+        if (!_technology.empty() && _technology != technology)
+            _events.changed(technology);
+        _technology = technology;
+        std::unique_ptr<LogGenerator> decoder = makeDecoder(technology);
+        if (!decoder)
+            _events.unknown(technology);
+        return decoder;
+    }
+
+private:
+    [[nodiscard]] std::unique_ptr<LogGenerator> makeDecoder(std::string_view technology) {
+        const DecoderLog log(_lines);
+        return VelmoraModel::generatorFromTechnology(technology);
+    }
+
+    DecoderLines& _lines;
+    Events _events;
+    std::string _technology;
+};
+
+} // namespace velmora
