@@ -100,11 +100,11 @@ _velmora_log() {
     done
     case $prev in
     --format)
-        if [[ $command == fields ]]; then
-            _velmora_offer text json csv
-        else
-            _velmora_offer text json jsonl csv
-        fi
+        case $command in
+        info) _velmora_offer text json ;;
+        fields) _velmora_offer text json csv ;;
+        *) _velmora_offer text json jsonl csv ;;
+        esac
         return
         ;;
     --role)
@@ -139,7 +139,7 @@ _velmora_log() {
     watch) options+=(--once --timeout) ;;
     record) options+=(--force --duration --count --timeout) ;;
     convert) options+=(--force --from --to --code --technology --description --strict) ;;
-    info) options+=(--technology) ;;
+    info) options+=(--format --technology) ;;
     fields) options+=(--technology --role --format) ;;
     esac
     if [[ $cur == -* ]]; then
@@ -148,7 +148,7 @@ _velmora_log() {
     fi
     # As many files as the command takes.
     case $command:$files in
-    decode:* | record:0 | convert:[01] | info:0) _filedir '@(pcapng|velmora|dlf)' ;;
+    decode:* | info:* | record:0 | convert:[01]) _filedir '@(pcapng|velmora|dlf)' ;;
     esac
 }
 

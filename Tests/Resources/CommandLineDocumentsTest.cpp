@@ -225,7 +225,8 @@ TEST_F(Completion, offersFiles) {
     EXPECT_EQ(offered("velmora-log info " + folder + "g"), gsm);
     EXPECT_EQ(offered("velmora-log decode - " + folder + "g"), gsm);
     EXPECT_EQ(offered("velmora-log --log-level 4 convert a.dlf " + folder + "g"), gsm);
-    EXPECT_EQ(offered("velmora-log info a.dlf " + folder + "g"), Words{}) << "it takes one file";
+    EXPECT_EQ(offered("velmora-log info a.dlf " + folder + "g"), gsm);
+    EXPECT_EQ(offered("velmora-log record a.pcapng " + folder + "g"), Words{}) << "it takes one file";
     EXPECT_EQ(offered("velmora-log watch " + folder + "g"), Words{}) << "it takes none";
     EXPECT_EQ(offered("velmora-log fields " + folder + "g"), Words{}) << "it takes none";
     EXPECT_EQ(offered("velmora-log decode --select " + folder + "g"), Words{}) << "no file belongs there";

@@ -131,12 +131,17 @@ TEST(CommandLineTest, ConvertTakesWhatTheNewFileIsToBe) {
     EXPECT_EQ(plain->description, "");
 }
 
-TEST(CommandLineTest, InfoTakesAFileAndATechnology) {
-    const CommandLine line = parse({"info", "a.dlf", "--technology", "Ostrel_LTE"});
+TEST(CommandLineTest, InfoTakesFilesFormatAndTechnology) {
+    const CommandLine line = parse({"info", "a.dlf", "--technology", "Ostrel_LTE", "--format", "json", "-"});
     const auto* info = std::get_if<InfoOptions>(&line.command);
     ASSERT_NE(info, nullptr);
-    EXPECT_EQ(info->file, "a.dlf");
+    EXPECT_THAT(info->files, ElementsAre("a.dlf", "-"));
     EXPECT_EQ(info->technology, "Ostrel_LTE");
+    EXPECT_EQ(info->format, InfoOptions::Format::Json);
+    const CommandLine plainLine = parse({"info", "a.dlf"});
+    const auto* plain = std::get_if<InfoOptions>(&plainLine.command);
+    ASSERT_NE(plain, nullptr);
+    EXPECT_EQ(plain->format, InfoOptions::Format::Text);
 }
 
 TEST(CommandLineTest, TechnologiesHaveShortFormsInAnyCase) {
@@ -225,7 +230,8 @@ TEST(CommandLineTest, UsageErrorsGiveTheFoundAndTheExpectedValue) {
         {{"convert", "--technology", "Ostrel_XYZ", "a", "b.dlf"},
          "--technology: got Ostrel_XYZ, wanted one of " + technologies},
         {{"info", "--technology", "", "a"}, "--technology: got , wanted one of " + technologies},
-        {{"info", "a", "b"}, "The following argument was not expected: b"},
+        {{"info"}, "FILE is required"},
+        {{"info", "--format", "jsonl", "a"}, "--format: got jsonl, wanted text or json"},
         {{"fields", "a"}, "The following argument was not expected: a"},
         {{"fields", "--format", "jsonl"}, "--format: got jsonl, wanted text or json or csv"},
         {{"fields", "--technology", "5G"}, "--technology: got 5G, wanted one of " + technologies},
