@@ -283,18 +283,6 @@ TEST_F(DecodeCommandTest, DecoderLinesAreSummedUpUnlessVerbose) {
     }
 }
 
-TEST_F(DecodeCommandTest, ADecoderThatEndsTheProgramHasItsLinesSummedUpBefore) {
-    const std::vector<std::uint64_t> offsets = writeRecording(
-        "sim.pcapng", "Ostrel_GSM",
-        {{at(0), record(0x512C, "04 00 01 00", 2)}, {at(1), record(0x0000, "DE AD BE EF", 0xFF)}});
-    ToolProcess process(tool({"decode", "--strict", path("sim.pcapng")}));
-    EXPECT_EQ(process.exitStatus(), 1);
-    EXPECT_THAT(process.errors(), testing::StartsWith("<3>Invalid log type: 2. Dropping.\n"));
-    EXPECT_THAT(process.errors(), testing::EndsWith("velmora-log: " + path("sim.pcapng") +
-                                                    ": record 2 at offset " + std::to_string(offsets[1]) +
-                                                    ": SIM File dictionary data could not be constructed\n"));
-}
-
 TEST_F(DecodeCommandTest, LogLevelDecidesWhichLinesAreWritten) {
     writeDrive("drive.pcapng");
     ToolProcess quiet(tool({"--log-level", "0", "decode", path("drive.pcapng")}));
