@@ -103,7 +103,6 @@ void DisplayCheck::expectObserved(const ShownDisplay& shown) {
     for (const auto& [path, leaf] : shown.leaves) {
         const auto found = _seen.find(path);
         if (found == _seen.end())
-            // A display is built with the first message: what its template has is not written yet.
             _problems.push_back(path + " shows \"" + leaf.texts.back() + "\" and is not observed");
         else if (found->second.back().leaf->path != leaf.pattern)
             _problems.push_back(path + " is " + found->second.back().leaf->path + " in the catalogue");
