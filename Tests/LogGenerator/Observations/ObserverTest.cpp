@@ -180,7 +180,8 @@ TEST_F(ObserverTest, ALabelThatIsRemovedIsReported) {
     begin(contents);
     observer.removed("Second");
     observer.removed("Third");
-    EXPECT_THAT(observer.message(Time(), std::nullopt, std::nullopt).removed, ElementsAre(&leaf("/Section/Second")));
+    EXPECT_THAT(observer.message(Time(), std::nullopt, std::nullopt).removed,
+                ElementsAre(&leaf("/Section/Second")));
     EXPECT_THAT(observations(), IsEmpty());
 }
 
@@ -194,7 +195,8 @@ TEST_F(ObserverTest, AMessageForgetsTheOneBefore) {
     observer.endList();
     observer.removed("First");
     observer.beginMessage();
-    const ObservedMessage message = observer.message(0x1234, 99);
+    const ObservedMessage message = observer.message(Time(std::chrono::seconds(3)), 0x1234, 99);
+    EXPECT_EQ(message.arrival, Time(std::chrono::seconds(3)));
     EXPECT_TRUE(message.observations.empty());
     EXPECT_TRUE(message.lists.empty());
     EXPECT_TRUE(message.removed.empty());
