@@ -65,6 +65,43 @@ TEST(CommandLineTest, DecodeTakesWhatLinesAndPartsAreWanted) {
     EXPECT_FALSE(plain->messages.isWarm);
 }
 
+TEST(CommandLineTest, DecodeTakesWhichSamplesAreWanted) {
+    struct Case {
+        std::vector<const char*> arguments;
+        DecodeOptions::Samples samples;
+    };
+    const Case cases[] = {
+        {{"decode", "--format", "jsonl", "a"}, DecodeOptions::Samples::None},
+        {{"decode", "--format", "jsonl", "--samples", "a"}, DecodeOptions::Samples::Long},
+        {{"decode", "--format", "csv", "--samples", "a"}, DecodeOptions::Samples::Long},
+        {{"decode", "--format", "csv", "--samples", "--wide", "--select", "/A", "a"},
+         DecodeOptions::Samples::Wide},
+        {{"decode", "--wide", "--format", "csv", "--samples", "--select", "/A", "a"},
+         DecodeOptions::Samples::Wide},
+    };
+    for (const Case& row : cases) {
+        const CommandLine line = parse(row.arguments);
+        const auto* decode = std::get_if<DecodeOptions>(&line.command);
+        ASSERT_NE(decode, nullptr);
+        EXPECT_EQ(decode->samples, row.samples);
+        EXPECT_EQ(decode->maximumAge, std::nullopt);
+    }
+}
+
+TEST(CommandLineTest, DecodeTakesNamesOfPathsAndAnAge) {
+    const CommandLine line = parse({"decode", "--format", "jsonl", "--every", "message", "--select",
+                                    "level=/A/*/B", "--select", "/C=/D", "a"});
+    const auto* decode = std::get_if<DecodeOptions>(&line.command);
+    ASSERT_NE(decode, nullptr);
+    EXPECT_THAT(decode->selection.paths(), ElementsAre("/A/*/B", "/C=/D"));
+    EXPECT_THAT(decode->selection.names(), ElementsAre("level", "/C=/D"));
+    const CommandLine agedLine =
+        parse({"decode", "--format", "csv", "--select", "/A", "--max-age", "2.5", "a"});
+    const auto* aged = std::get_if<DecodeOptions>(&agedLine.command);
+    ASSERT_NE(aged, nullptr);
+    EXPECT_EQ(aged->maximumAge, std::chrono::milliseconds(2500));
+}
+
 TEST(CommandLineTest, WithoutOptionsLogLinesOfErrorsGoToStandardError) {
     const CommandLine line = parse({"decode", "a"});
     const auto* decode = std::get_if<DecodeOptions>(&line.command);
@@ -215,8 +252,23 @@ TEST(CommandLineTest, UsageErrorsGiveTheFoundAndTheExpectedValue) {
          "--every message: got another format, wanted --format jsonl or csv"},
         {{"decode", "--every", "message", "--format", "json", "a"},
          "--every message: got another format, wanted --format jsonl or csv"},
-        {{"decode", "--every", "message", "--format", "jsonl", "--select", "/A", "a"},
-         "--every message: got --select with --format jsonl, wanted it with --format csv or not at all"},
+        {{"decode", "--select", "=/GSM", "a"}, "--select: got =/GSM, wanted a path that begins with a slash"},
+        {{"decode", "--samples", "a"}, "--samples: got another format, wanted --format jsonl or csv"},
+        {{"decode", "--samples", "--format", "csv", "--every", "message", "a"},
+         "--samples: got --every message too, wanted one of the two"},
+        {{"decode", "--wide", "--format", "csv", "--select", "/A", "a"}, "--wide requires --samples"},
+        {{"decode", "--samples", "--wide", "--format", "csv", "a"},
+         "--wide: got no --select, wanted one for each column"},
+        {{"decode", "--samples", "--wide", "--format", "jsonl", "--select", "/A", "a"},
+         "--wide: got another format, wanted --format csv"},
+        {{"decode", "--max-age", "0", "--format", "jsonl", "a"},
+         "--max-age: got 0, wanted seconds from 0.001 to 2000000"},
+        {{"decode", "--max-age", "5", "a"},
+         "--max-age: got another output, wanted --every refresh with --format jsonl or csv"},
+        {{"decode", "--max-age", "5", "--format", "jsonl", "--every", "message", "a"},
+         "--max-age: got another output, wanted --every refresh with --format jsonl or csv"},
+        {{"decode", "--max-age", "5", "--format", "jsonl", "--samples", "a"},
+         "--max-age: got another output, wanted --every refresh with --format jsonl or csv"},
         {{"decode", "--bogus", "a"}, "The following argument was not expected: --bogus"},
         {{"record", "a", "--count", "0"}, "--count: got 0, wanted a number above 0"},
         {{"record", "a", "--duration", "0"}, "--duration: got 0, wanted seconds from 0.001 to 2000000"},

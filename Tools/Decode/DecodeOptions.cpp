@@ -92,7 +92,7 @@ CLI::App* addDecode(CLI::App& app, DecodeOptions& options) {
             },
             "At each refresh, leave out values that were reported longer ago: a display keeps what it shows "
             "until something else replaces it")
-        ->check(CLI::Range(0.0, 1e9))
+        ->check(positiveSeconds())
         ->type_name("SECONDS");
     command
         ->add_option_function<std::vector<std::string>>(

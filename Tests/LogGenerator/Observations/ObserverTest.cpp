@@ -195,7 +195,8 @@ TEST_F(ObserverTest, AMessageForgetsTheOneBefore) {
     observer.endList();
     observer.removed("First");
     observer.beginMessage();
-    const ObservedMessage message = observer.message(Time(), 0x1234, 99);
+    const ObservedMessage message = observer.message(Time(std::chrono::seconds(3)), 0x1234, 99);
+    EXPECT_EQ(message.arrival, Time(std::chrono::seconds(3)));
     EXPECT_TRUE(message.observations.empty());
     EXPECT_TRUE(message.lists.empty());
     EXPECT_TRUE(message.removed.empty());

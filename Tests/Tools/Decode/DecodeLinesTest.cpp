@@ -90,7 +90,8 @@ TEST_F(DecodeLinesTest, SelectionRestrictsEveryFormat) {
               R"({"time":"2026-11-16T05:00:04.000000000Z","technology":"Ostrel_GSM","messages":1,)"
               R"("display":{"GSM RR Info":{"RR State":"RR_IDLE"}}})"
               "\n");
-    EXPECT_EQ(decode({"--select", "/Nothing", path("a.pcapng")}), "");
+    // A place that the display can have, and has not.
+    EXPECT_EQ(decode({"--select", "/SIM Info/EF-LOCI", path("a.pcapng")}), "");
 }
 
 TEST_F(DecodeLinesTest, LinesBeforeADecoderEndsAreComplete) {

@@ -15,8 +15,8 @@ class DecodeRowsTest : public DecodeLinesTest {};
 TEST_F(DecodeRowsTest, CsvHasARowForEachRefreshAndACellForEachPath) {
     writeDrive("a.pcapng");
     EXPECT_EQ(decode({"--format", "csv", "--select", "/GSM RR Info/RR State", "--select",
-                      "/No, such/\"path\"", path("a.pcapng"), "--select", "/UMTS RR Info"}),
-              "time,/GSM RR Info/RR State,\"/No, such/\"\"path\"\"\",/UMTS RR Info\r\n"
+                      "a, \"b\"=/SIM Info/EF-LOCI", path("a.pcapng"), "--select", "/UMTS RR Info"}),
+              "time,/GSM RR Info/RR State,\"a, \"\"b\"\"\",/UMTS RR Info\r\n"
               "2026-11-16T05:00:02.000000000Z,RR_PLMN_LIST_CONSTRUCTION,,{}\r\n"
               "2026-11-16T05:00:04.000000000Z,RR_IDLE,,{}\r\n");
 }

@@ -9,7 +9,9 @@
 #include <gmock/gmock.h>
 
 #include <fstream>
+#include <stdexcept>
 #include <string>
+#include <string_view>
 #include <utility>
 #include <vector>
 
@@ -48,6 +50,20 @@ protected:
     static std::string check(const std::string& text) { return checkJSON("velmora-log.schema.json", text); }
 };
 
+/// A part of the technology's displays that is in a list where it has one.
+std::string_view partOf(const ScenarioKind& kind) {
+    constexpr std::pair<std::string_view, std::string_view> parts[] = {
+        {"gsm", "/GSM/Neighboring Cells/1"},
+        {"lte", "/Idle Mode Neighbors/Neighbor Cells List/*/Measured RSRP"},
+        {"utran", "/Neighbors/Neighbor Cell List/0"},
+        {"c2k", "/EV-DO"},
+        {"ifx", "/Neighbor Cells/1"}};
+    for (const auto& [name, path] : parts)
+        if (name == kind.name)
+            return path;
+    throw std::logic_error("a drive of no technology");
+}
+
 /// The technology's place among the scenarios.
 class TechnologyJSONTest : public JSONSchemaTest, public testing::WithParamInterface<std::size_t> {};
 
@@ -68,9 +84,16 @@ TEST_P(TechnologyJSONTest, AllOfItKeepsToTheSchema) {
         {{"decode", "--format", "json", "--to", "0", file}, "1\n"},
         {{"decode", "--format", "jsonl", file}, ""},
         {{"decode", "--format", "jsonl", file, file}, ""},
-        {{"decode", "--format", "jsonl", "--select", "/GSM/Neighboring Cells/1", file}, ""},
+        {{"decode", "--format", "jsonl", "--select", std::string(partOf(kind)), file}, ""},
         {{"decode", "--format", "jsonl", "--every", "message", file}, messages},
         {{"decode", "--format", "jsonl", "--every", "message", "--jobs", "2", file, "/dev/null"}, messages},
+        {{"decode", "--format", "jsonl", "--every", "message", "--select", std::string(partOf(kind)), file},
+         ""},
+        {{"decode", "--format", "jsonl", "--samples", "--to", "+10", file}, ""},
+        {{"decode", "--format", "jsonl", "--samples", "--select", "a=" + std::string(partOf(kind)), file,
+          "/dev/null"},
+         ""},
+        {{"decode", "--format", "jsonl", "--max-age", "1", file}, ""},
     };
     for (const Case& row : cases) {
         ToolProcess process(shipped(row.arguments));
@@ -94,7 +117,8 @@ TEST_F(JSONSchemaTest, FileOfAllTechnologiesKeepsToTheSchema) {
     for (const auto& [arguments, objects] :
          {std::pair<std::vector<std::string>, std::string>{{"--format", "json"}, "5\n"},
           {{"--format", "jsonl", "--every", "message"}, messages},
-          {{"--format", "jsonl", "--from", "+1"}, ""}}) {
+          {{"--format", "jsonl", "--from", "+1"}, ""},
+          {{"--format", "jsonl", "--samples", "--to", "+2"}, ""}}) {
         std::vector<std::string> words = {"decode", path("all.pcapng")};
         words.insert(words.end(), arguments.begin(), arguments.end());
         ToolProcess process(shipped(words));
@@ -126,7 +150,12 @@ TEST_F(JSONSchemaTest, CheckerFindsWhatIsWrong) {
           std::string(R"({"time":"2026-11-16T05:00:00.000000000Z","code":1,"sections":{},)") + // a key twice
               R"("code":1})" + "\n",
           std::string(R"({"time":"2026-11-16T05:00:00.000000000Z","code":1,"sections":{"A":1}})") + "\n",
-          good + "\n\xFF\n", // no UTF-8
+          std::string(
+              R"({"time":"2026-11-16T05:00:00.000000000Z","path":"/A","value":{},"text":"","code":1,)") +
+              R"("record":1})" + "\n", // no value
+          std::string(R"({"time":"2026-11-16T05:00:00.000000000Z","path":"/A","value":1,"unit":"W",)") +
+              R"("text":"","code":1,"record":1})" + "\n", // another unit
+          good + "\n\xFF\n",                              // no UTF-8
           good + "\nNaN\n"})
         EXPECT_THAT(check(bad), testing::StartsWith("status")) << bad;
 }

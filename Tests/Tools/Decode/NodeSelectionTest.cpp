@@ -6,12 +6,16 @@
 #include "Tools/Text/JSONText.h"
 #include "Tools/Text/TreeText.h"
 
+#include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
 #include <string>
+#include <vector>
 
 namespace velmora {
 namespace {
+
+using testing::ElementsAre;
 
 Value dictionary(std::initializer_list<Dictionary::Entry> entries) {
     return std::make_shared<Dictionary>(entries);
@@ -120,7 +124,19 @@ TEST(NodeSelectionTest, RestrictedDisplayKeepsWhatLeadsToTheNodes) {
          R"({"Cells":[{"ARFCN":"17","RSSI":"-70 dBm"},{"ARFCN":"18","RSSI":"-80 dBm"}]})",
          "Cells\n  0\n    ARFCN  17\n    RSSI   -70 dBm\n  1\n    ARFCN  18\n    RSSI   -80 dBm\n"},
         {{"/Empty"}, R"({"Empty":{}})", "Empty\n"},
-        {{"/Nothing", "/Band/GSM", "/Cells/7"}, "null", ""},
+        {{"/Cells/*/ARFCN"},
+         R"({"Cells":[{"ARFCN":"17"},{"ARFCN":"18"}]})",
+         "Cells\n  0\n    ARFCN  17\n  1\n    ARFCN  18\n"},
+        {{"/*/40"},
+         R"({"Pilots":{"2;40":"-9 dB","1;40":"-8 dB","_sorted":"yes"}})",
+         "Pilots\n  40  -8 dB\n  40  -9 dB\n"},
+        {{"/*/Name", "/*/*/Other"},
+         R"({"SPN/PNN":{"Name":"Home"},"SPN":{"PNN":{"Other":"Away"}}})",
+         "SPN/PNN\n  Name  Home\nSPN\n  PNN\n    Other  Away\n"},
+        {{"level=/Cells/1/RSSI"},
+         R"({"Cells":[null,{"RSSI":"-80 dBm"}]})",
+         "Cells\n  1\n    RSSI  -80 dBm\n"},
+        {{"/Nothing", "/Band/GSM", "/Cells/7", "/*/*/BSIC", "/Band/*"}, "null", ""},
     };
     const Value shown = display();
     PathDictionary nodes;
@@ -131,6 +147,54 @@ TEST(NodeSelectionTest, RestrictedDisplayKeepsWhatLeadsToTheNodes) {
         const NodeRef part = selection.restricted(root);
         EXPECT_EQ(part ? treeText(*part) : "", row.text);
     }
+}
+
+TEST(NodeSelectionTest, NamesAreThoseOfTheirPathsOrThePaths) {
+    const NodeSelection selection({"/Band", "level=/Cells/*/RSSI", "a=b=/Cells", "/Odd=/Band", "ratio=/*"});
+    EXPECT_THAT(selection.paths(), ElementsAre("/Band", "/Cells/*/RSSI", "/Cells", "/Odd=/Band", "/*"));
+    EXPECT_THAT(selection.names(), ElementsAre("/Band", "level", "a=b", "/Odd=/Band", "ratio"));
+    for (const char* text : {"", "Band", "=/Band", "name=Band"})
+        EXPECT_FALSE(NodeSelection::isPath(text)) << text;
+}
+
+TEST(NodeSelectionTest, AStarIsANameOfItsOwn) {
+    for (const char* path : {"/*", "/*/ARFCN", "/Cells/*", "/Cells/*/ARFCN"})
+        EXPECT_TRUE(NodeSelection::hasWildcard(path)) << path;
+    for (const char* path : {"/", "/Cells", "/Cells/5*", "/*5/ARFCN", "/Cells/**"})
+        EXPECT_FALSE(NodeSelection::hasWildcard(path)) << path;
+}
+
+TEST(NodeSelectionTest, AllValuesOfAStarAreFoundInTheDisplaysOrder) {
+    const Value shown = display();
+    const auto all = [&shown](const char* path) {
+        std::vector<const Value*> found;
+        NodeSelection::findAll(shown, path, found);
+        std::vector<std::string> texts;
+        for (const Value* const value : found)
+            texts.push_back(json(*value));
+        return texts;
+    };
+    EXPECT_THAT(all("/Cells/*/RSSI"), ElementsAre("\"-70 dBm\"", "\"-80 dBm\""));
+    EXPECT_THAT(all("/*/1/ARFCN"), ElementsAre("\"18\""));
+    EXPECT_THAT(all("/Pilots/*"), ElementsAre("\"-9 dB\"", "\"-8 dB\"", "\"odd\""));
+    EXPECT_THAT(all("/*/Name"), ElementsAre("\"Home\""));
+    EXPECT_THAT(all("/Band/*"), ElementsAre());
+    EXPECT_THAT(all("/*/*/BSIC"), ElementsAre());
+}
+
+TEST(NodeSelectionTest, APartOfADisplayIsRestrictedByItsPlace) {
+    Catalogue catalogue("Test");
+    const CatalogueNode& cells = catalogue.root().child("Group").child("Cells");
+    const Value part = list({dictionary({{"ARFCN", "17"}}), dictionary({{"ARFCN", "18"}, {"RSSI", "-80"}})});
+    const auto restricted = [&](const char* path) {
+        return json(NodeSelection({path}).restrictedAt(cells, part));
+    };
+    EXPECT_EQ(restricted("/Group/Cells/1/ARFCN"), R"([null,{"ARFCN":"18"}])");
+    EXPECT_EQ(restricted("/*/*/*/RSSI"), R"([null,{"RSSI":"-80"}])");
+    for (const char* path : {"/", "/Group", "/Group/Cells", "/*"})
+        EXPECT_EQ(restricted(path), json(part)) << path;
+    for (const char* path : {"/Other", "/Group/Cell", "/Group/Cells/2"})
+        EXPECT_EQ(restricted(path), "null") << path;
 }
 
 TEST(NodeSelectionTest, RootAndNoPathsAreEverything) {
