@@ -94,7 +94,7 @@ private:
     std::optional<Failure> _failure;
 };
 
-enum Printed : std::int64_t { TheEnd, EveryRefresh, EveryMessage };
+enum Printed : std::int64_t { TheEnd, EveryRefresh, EveryMessage, SampleObjects, SampleCells };
 
 /// The scenario's place in the registry, and what is printed.
 void decodeDrive(benchmark::State& state) {
@@ -104,11 +104,16 @@ void decodeDrive(benchmark::State& state) {
     options.files = {"drive"};
     if (state.range(1) == TheEnd)
         options.format = DecodeOptions::Format::Json;
+    else if (state.range(1) == SampleCells)
+        options.format = DecodeOptions::Format::Csv;
     else
         options.format = DecodeOptions::Format::JsonLines;
+    if (state.range(1) == SampleObjects || state.range(1) == SampleCells)
+        options.samples = DecodeOptions::Samples::Long;
     if (state.range(1) == EveryMessage)
         options.every = DecodeOptions::Every::Message;
-    constexpr const char* names[] = {"in the end", "every refresh", "every message"};
+    constexpr const char* names[] = {"in the end", "every refresh", "every message", "samples, jsonl",
+                                     "samples, csv"};
     state.SetLabel(std::string(kind.name) + ", " + names[state.range(1)]);
 
     redirectConsole(stderr);
@@ -119,7 +124,7 @@ void decodeDrive(benchmark::State& state) {
         Output output(nowhere);
         WorkContext context("drive");
         DriveReader reader(kind, count);
-        SampleColumns columns;
+        SampleColumns columns; // of wide tables alone
         for (auto step : state) {
             reader.rewind();
             const std::unique_ptr<DecodeWriter> writer =
@@ -135,7 +140,7 @@ void decodeDrive(benchmark::State& state) {
     state.SetItemsProcessed(state.iterations() * static_cast<std::int64_t>(count));
 }
 BENCHMARK(decodeDrive)
-    ->ArgsProduct({{0, 1, 2, 3, 4}, {TheEnd, EveryRefresh, EveryMessage}})
+    ->ArgsProduct({{0, 1, 2, 3, 4}, {TheEnd, EveryRefresh, EveryMessage, SampleObjects, SampleCells}})
     ->Unit(benchmark::kMillisecond);
 
 } // namespace

@@ -106,7 +106,7 @@ private:
     static void expectSameInCopy(const Contents& whole, const Data& file) {
         const auto reader = PcapngReader::open(ChunkedInput(std::make_unique<MemorySource>(file)));
         std::vector<std::uint8_t> bytes;
-        RecordingCopy copy(**reader, std::make_unique<MemoryFile>(bytes), "the copy");
+        RecordingCopy copy(**reader, std::make_unique<MemoryFile>(bytes), "the copy", {});
         while ((*reader)->next())
             require(bool(copy.addMessage()), "memory can be written");
         require(bool(copy.finish()), "memory can be written");

@@ -77,6 +77,27 @@ _velmora_telephonyd() {
     _velmora_offer -h --help --version --source --log --log-level
 }
 
+# Offers the paths of the fields that velmora-log lists, of the technology where the command names one. What
+# follows a name and an equals sign is a word of its own to bash.
+_velmora_path() {
+    local i name='' technology=() path
+    for ((i = 1; i < cword; ++i)); do
+        [[ ${words[i]} != --technology ]] || technology=(--technology "${words[i + 1]}")
+    done
+    cur=${cur#[\'\"]}
+    cur=${cur//\\/}
+    if [[ $cur == [!/]*=* ]]; then
+        [[ $COMP_WORDBREAKS == *=* ]] || name=${cur%%=*}=
+        cur=${cur#*=}
+    fi
+    COMPREPLY=()
+    # The second cell; a path with a comma is quoted there, and is left out.
+    while IFS=, read -r _ path _; do
+        [[ $path != /* || $path != "$cur"* ]] || COMPREPLY+=("$name$path")
+    done < <("${words[0]}" fields "${technology[@]}" --format csv 2>/dev/null)
+    compopt -o filenames 2>/dev/null # so that bash quotes the blanks
+}
+
 _velmora_log() {
     local cur prev words cword split
     _init_completion -s || return
@@ -85,7 +106,7 @@ _velmora_log() {
     for ((i = 1; i < cword; ++i)); do
         case ${words[i]} in
         --log | --log-level | --format | --every | --select | --from | --to | --code | --technology | --jobs | \
-            --duration | --count | --timeout | --description | --role)
+            --max-age | --duration | --count | --timeout | --description | --role)
             ((++i))
             ;;
         -?*) ;;
@@ -119,7 +140,11 @@ _velmora_log() {
         _velmora_offer "${_velmora_technologies[@]}" GSM CDMA LTE UTRAN
         return
         ;;
-    --select | --from | --to | --code | --jobs | --duration | --count | --timeout | --description)
+    --select)
+        _velmora_path
+        return
+        ;;
+    --max-age | --from | --to | --code | --jobs | --duration | --count | --timeout | --description)
         return # nothing that could be guessed
         ;;
     esac
@@ -135,7 +160,7 @@ _velmora_log() {
         fi
         return
         ;;
-    decode) options+=(--format --every --select --from --to --code --warm --technology --strict --jobs) ;;
+    decode) options+=(--format --every --samples --wide --max-age --select --from --to --code --warm --technology --strict --jobs) ;;
     watch) options+=(--once --timeout) ;;
     record) options+=(--force --duration --count --timeout) ;;
     convert) options+=(--force --from --to --code --technology --description --strict) ;;

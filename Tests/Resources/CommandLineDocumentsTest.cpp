@@ -8,11 +8,14 @@
 #include "Tests/Resources/HelpText.h"
 #include "Tests/Support/ShellCommand.h"
 #include "Tests/Support/ShippedResources.h"
+#include "Tests/Support/TemporaryDirectory.h"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
+#include <cstdlib>
 #include <filesystem>
+#include <fstream>
 #include <set>
 #include <string>
 
@@ -217,6 +220,32 @@ TEST_F(Completion, offersSources) {
             << kind;
     }
     EXPECT_EQ(offered(line + "replay:x,technology="), technologies());
+}
+
+TEST_F(Completion, offersThePathsThatTheProgramLists) {
+    // In place of velmora-log, one that lists two technologies' fields.
+    const TemporaryDirectory directory;
+    const std::filesystem::path program = directory / "velmora-log";
+    std::ofstream(program) << "#!/bin/sh\n"
+                              "[ \"$1\" = fields ] && [ \"$*\" != \"${*%--format csv}\" ] || exit 1\n"
+                              "echo technology,path,section,kind\n"
+                              "[ \"$3\" = Ostrel_LTE ] || echo 'IFX,/Serving Cell/ARFCN,,number'\n"
+                              "echo 'Ostrel_LTE,/Serving Cell/Info/*/Cell ID,Info,number'\n";
+    std::filesystem::permissions(program, std::filesystem::perms::owner_all);
+    const std::string path = ::getenv("PATH");
+    ::setenv("PATH", ((directory / "").string() + ":" + path).c_str(), 1);
+    const Words both = {"/Serving Cell/ARFCN", "/Serving Cell/Info/*/Cell ID"};
+    const Words lte = {"/Serving Cell/Info/*/Cell ID"};
+    EXPECT_EQ(offered("velmora-log decode --select "), both);
+    EXPECT_EQ(offered("velmora-log decode --select /Serv"), both);
+    EXPECT_EQ(offered("velmora-log decode --select '/Serv"), both);
+    EXPECT_EQ(offered("velmora-log decode --select=/Serv"), both);
+    EXPECT_EQ(offered("velmora-log decode --select name=/Serv"), both); // the name is a word of its own
+    EXPECT_EQ(offered("velmora-log decode --technology Ostrel_LTE --select /Serv"), lte);
+    EXPECT_EQ(offered("velmora-log decode --select /Other"), Words{});
+    std::ofstream(program) << "#!/bin/sh\necho trouble >&2\nexit 2\n";
+    EXPECT_EQ(offered("velmora-log decode --select /Serv"), Words{});
+    ::setenv("PATH", path.c_str(), 1);
 }
 
 TEST_F(Completion, offersFiles) {

@@ -99,7 +99,9 @@ CLI::App* addDecode(CLI::App& app, DecodeOptions& options) {
             "--select",
             [&options](const std::vector<std::string>& paths) { options.selection = NodeSelection(paths); },
             "Only this part of the display, by a path of the names on the screens: "
-            "\"/GSM/GSM Serving Cell/RSSI\", \"/GSM/Neighboring Cells/0\"; may be repeated")
+            "\"/GSM/GSM Serving Cell/RSSI\", \"/GSM/Neighboring Cells/0\"; a * is any name or row, as in "
+            "\"/GSM/Neighboring Cells/*/RSSI\", and \"level=/GSM/GSM Serving Cell/RSSI\" names a column; may "
+            "be repeated")
         ->check(validator(NodeSelection::isPath, "a path that begins with a slash"))
         ->expected(1)
         ->allow_extra_args(false) // a FILE may follow
@@ -129,6 +131,11 @@ CLI::App* addDecode(CLI::App& app, DecodeOptions& options) {
         "  velmora-log decode --format json drive.pcapng | jq .display\n"
         "  velmora-log decode --format jsonl --every message --from +60 --to +120 drive.pcapng\n"
         "  velmora-log decode --format csv --select '/GSM/GSM Serving Cell/RSSI' drive.pcapng > rssi.csv\n"
+        "  velmora-log decode --samples --format csv --select 'level=/GSM/GSM Serving Cell/RSSI' "
+        "drive.pcapng\n"
+        "  velmora-log decode --samples --format jsonl --select '/GSM/Neighboring Cells/*/RSSI' "
+        "drive.pcapng\n"
+        "  velmora-log decode --max-age 5 --format csv --select '/GSM/GSM Serving Cell/RSSI' drive.pcapng\n"
         "  velmora-log decode --warm --from 2026-11-16T05:00:00Z --format jsonl drive.pcapng\n"
         "  velmora-log decode --from 2026-11-16T05:00:00Z --select /GSM drive.pcapng\n"
         "  velmora-log decode --format jsonl --jobs 4 monday/*.pcapng > monday.jsonl\n"

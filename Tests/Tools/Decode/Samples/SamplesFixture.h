@@ -17,34 +17,15 @@ namespace velmora {
 /// recordings.
 class SamplesTest : public SeveralTechnologiesTest {
 protected:
-    [[nodiscard]] static std::string recording(const std::string& name) {
-        return VELMORA_SOURCE_DIR "/Tests/Recordings/" + name + ".pcapng";
-    }
+    [[nodiscard]] static std::string recording(const std::string& name);
     /// Standard output of `decode --samples` with these arguments.
     std::string samples(std::vector<std::string> arguments, std::optional<std::string> input = std::nullopt) {
         arguments.insert(arguments.begin(), {"decode", "--samples"});
         return run(std::move(arguments), 0, std::move(input));
     }
-    [[nodiscard]] static std::string samplesOfRecording(std::vector<std::string> arguments) {
-        arguments.insert(arguments.begin(), {"decode", "--samples", "--log-level", "0"});
-        ToolProcess::Setup setup;
-        setup.arguments = std::move(arguments);
-        setup.environment = {{"VELMORA_RESOURCES", VELMORA_SOURCE_DIR "/Resources"}, {"TZ", "UTC"}};
-        ToolProcess process(setup);
-        EXPECT_EQ(process.exitStatus(), 0) << process.errors();
-        return process.output();
-    }
+    [[nodiscard]] static std::string samplesOfRecording(std::vector<std::string> arguments);
     /// The lines that record-values.py prints, which reads a recording without Velmora.
-    [[nodiscard]] static std::vector<std::string> recordValues(std::vector<std::string> arguments) {
-        arguments.insert(arguments.begin(),
-                         VELMORA_SOURCE_DIR "/Tests/Tools/Decode/Samples/record-values.py");
-        ToolProcess::Setup setup;
-        setup.arguments = std::move(arguments);
-        setup.environment = {{"LD_PRELOAD", ""}};
-        ToolProcess reader(setup, "/usr/bin/python3");
-        EXPECT_EQ(reader.exitStatus(), 0) << reader.errors();
-        return lines(reader.output());
-    }
+    [[nodiscard]] static std::vector<std::string> recordValues(std::vector<std::string> arguments);
 
     [[nodiscard]] static std::vector<std::string> lines(const std::string& text) {
         std::vector<std::string> all;
