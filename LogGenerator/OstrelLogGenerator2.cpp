@@ -93,26 +93,22 @@ void OstrelLogGenerator2::updateWithData(const Data& message) {
 
 std::optional<std::uint32_t> OstrelLogGenerator2::route(const Data& message) {
     const std::optional<LogMessage> parsed = LogMessage::parse(message.bytes());
-    Observer* const observing = observer();
-    if (!observing)
-        return route(message, parsed);
-    observing->beginMessage();
-    const std::optional<std::uint32_t> code = route(message, parsed);
+    if (!observer())
+        return parsed ? routeParsed(message, *parsed) : std::nullopt;
+    observer()->beginMessage();
+    const std::optional<std::uint32_t> code = parsed ? routeParsed(message, *parsed) : std::nullopt;
     passObservations(code, parsed ? parsed->timestamp() : std::nullopt);
     return code;
 }
 
-std::optional<std::uint32_t> OstrelLogGenerator2::route(const Data& message,
-                                                        const std::optional<LogMessage>& parsed) {
-    if (!parsed)
-        return std::nullopt;
-    if (parsed->type != LogMessage::basebandType && parsed->type != LogMessage::extraType) {
-        logFormat(LogPriority::Error, "Invalid log type: %x. Dropping.", static_cast<unsigned>(parsed->type));
+std::optional<std::uint32_t> OstrelLogGenerator2::routeParsed(const Data& message, const LogMessage& parsed) {
+    if (parsed.type != LogMessage::basebandType && parsed.type != LogMessage::extraType) {
+        logFormat(LogPriority::Error, "Invalid log type: %x. Dropping.", static_cast<unsigned>(parsed.type));
         return std::nullopt;
     }
-    const std::uint32_t code = parsed->logCode();
+    const std::uint32_t code = parsed.logCode();
     std::optional<Data> stripped;
-    if (parsed->prefixed)
+    if (parsed.prefixed)
         stripped = message.from(LogMessage::prefixLength);
     const Data& data = stripped ? *stripped : message;
     if (const std::vector<Base*>* subscribers = cIndex->getSubscribers(code)) {

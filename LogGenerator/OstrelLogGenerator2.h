@@ -71,7 +71,7 @@ private:
     void describeSection(const Base& section, const Place& place, Catalogue& catalogue);
     /// Does what `updateWithData` does. Returns the code; none for a message that was dropped.
     std::optional<std::uint32_t> route(const Data& message);
-    std::optional<std::uint32_t> route(const Data& message, const std::optional<LogMessage>& parsed);
+    std::optional<std::uint32_t> routeParsed(const Data& message, const LogMessage& parsed);
     /// Sets the nodes of this decoder's sections to those of a display that an earlier decoder built.
     void attachSections(const Value& object);
 

@@ -24,8 +24,9 @@ std::string usageError(const CLI::App& app, const CLI::ParseError& error) {
         return error.what();
     const std::vector<std::string> rest = app.remaining();
     if (rest.empty())
-        return "no command, wanted decode, watch, record, convert or info";
-    return "got " + rest.front() + ", wanted one of the commands decode, watch, record, convert and info";
+        return "no command, wanted decode, watch, record, convert, info or fields";
+    return "got " + rest.front() +
+           ", wanted one of the commands decode, watch, record, convert, info and fields";
 }
 
 } // namespace
@@ -65,11 +66,13 @@ CommandLine parseCommandLine(int count, const char* const* arguments) {
     RecordOptions record;
     ConvertOptions convert;
     InfoOptions info;
+    FieldsOptions fields;
     const CLI::App* decodeCommand = addDecode(app, decode);
     const CLI::App* watchCommand = addWatch(app, watch);
     const CLI::App* recordCommand = addRecord(app, record);
     const CLI::App* convertCommand = addConvert(app, convert);
-    addInfo(app, info);
+    const CLI::App* infoCommand = addInfo(app, info);
+    addFields(app, fields);
 
     try {
         app.parse(count, arguments);
@@ -91,8 +94,10 @@ CommandLine parseCommandLine(int count, const char* const* arguments) {
         line.command = record;
     else if (convertCommand->parsed())
         line.command = convert;
-    else
+    else if (infoCommand->parsed())
         line.command = info;
+    else
+        line.command = fields;
     return line;
 }
 

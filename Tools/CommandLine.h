@@ -7,6 +7,7 @@
 #include "Platform/SystemLog.h"
 #include "Tools/Convert/ConvertOptions.h"
 #include "Tools/Decode/DecodeOptions.h"
+#include "Tools/Fields/FieldsOptions.h"
 #include "Tools/Info/InfoOptions.h"
 #include "Tools/Record/RecordOptions.h"
 #include "Tools/Watch/WatchOptions.h"
@@ -28,7 +29,9 @@ struct CommandLine {
     int logLevel = LogPriority::Error;
     bool verbose =
         false; ///< decoder lines as they arise, not summed up; those of objects made and destroyed too
-    std::variant<Notice, DecodeOptions, WatchOptions, RecordOptions, ConvertOptions, InfoOptions> command;
+    std::variant<Notice, DecodeOptions, WatchOptions, RecordOptions, ConvertOptions, InfoOptions,
+                 FieldsOptions>
+        command;
 };
 
 /// Parses the arguments, the program's name first. Never ends the program.

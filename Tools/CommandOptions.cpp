@@ -49,14 +49,18 @@ CLI::Validator positiveSeconds() {
 }
 
 void addTechnology(CLI::App& command, std::string& technology, const std::string& purpose) {
+    addTechnologyOption(command, technology,
+                        purpose +
+                            " this technology, overriding the file's; of a file of several technologies, "
+                            "this one alone");
+}
+
+void addTechnologyOption(CLI::App& command, std::string& technology, const std::string& description) {
     command
         .add_option_function<std::string>(
             "--technology",
             [&technology](const std::string& text) { technology = technologyMeantBy(text).value_or(text); },
-            purpose +
-                " this technology, overriding the file's; of a file of several technologies, this one "
-                "alone: " +
-                technologyForms())
+            description + ": " + technologyForms())
         ->check(validator([](const std::string& text) { return technologyMeantBy(text).has_value(); },
                           "one of " + technologyForms()))
         ->type_name("NAME");

@@ -25,5 +25,7 @@ namespace velmora {
 
 /// `--technology`, with a description that begins with `purpose`.
 void addTechnology(CLI::App& command, std::string& technology, const std::string& purpose);
+/// The same with a description of its own, which the names follow.
+void addTechnologyOption(CLI::App& command, std::string& technology, const std::string& description);
 
 } // namespace velmora

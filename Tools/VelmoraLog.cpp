@@ -9,6 +9,7 @@
 #include "Tools/Convert/ConvertCommand.h"
 #include "Tools/Decode/DecodeCommand.h"
 #include "Tools/ExitStatus.h"
+#include "Tools/Fields/FieldsCommand.h"
 #include "Tools/Info/InfoCommand.h"
 #include "Tools/Log/DecoderLog.h"
 #include "Tools/Log/QuietConsole.h"
@@ -59,6 +60,8 @@ int run(const CommandLine& line, DecoderLines& lines, Output& output) {
     const DecoderLog log(lines);
     if (const auto* info = std::get_if<InfoOptions>(&line.command))
         return runInfo(*info, output);
+    if (const auto* fields = std::get_if<FieldsOptions>(&line.command))
+        return runFields(*fields, output);
     return runConvert(std::get<ConvertOptions>(line.command));
 }
 

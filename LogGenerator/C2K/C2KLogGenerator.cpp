@@ -68,7 +68,9 @@ void findPlaces(const Dictionary& source, Catalogue::Node& node, Catalogue& cata
         } else if (const std::string* const key = value.asString(); key && *key != sortedMarker) {
             Catalogue::Node& shown = node.child(label);
             // The template's own text is shown until there is a value.
-            catalogue.leafAt(shown, "").absentTexts.emplace_back();
+            CatalogueField& leaf = catalogue.leafAt(shown, "");
+            leaf.kind = ObservedKind::Absent;
+            leaf.absentTexts.emplace_back();
             places[*key].push_back(&shown);
         }
     }

@@ -66,7 +66,7 @@ void GSMLogGenerator::updateState(Dictionary& state, const Data& data) {
     Value display = processObject(*object);
     state.set("DisplayState", *std::move(object));
     if (observing) {
-        observing->tree(catalogue(), catalogue().root(), {}, display);
+        observing->display(catalogue(), display);
         passObservations(std::nullopt, std::nullopt);
     }
     state.set("Display", std::move(display));

@@ -59,16 +59,16 @@ double physicalScale(const Field& field) {
 }
 
 CatalogueNode* CatalogueNode::find(std::string_view name) const {
-    for (const std::unique_ptr<CatalogueNode>& each : _children)
-        if (each->_name == name)
-            return each.get();
-    return nullptr;
+    const auto found = _byName.find(name);
+    return found == _byName.end() ? nullptr : found->second;
 }
 
 CatalogueNode& CatalogueNode::child(std::string_view name) {
     if (CatalogueNode* const found = find(name))
         return *found;
-    return *_children.emplace_back(std::make_unique<CatalogueNode>(name, this));
+    CatalogueNode& made = *_children.emplace_back(std::make_unique<CatalogueNode>(name, this));
+    _byName.emplace(made._name, &made);
+    return made;
 }
 
 std::string CatalogueNode::path() const {

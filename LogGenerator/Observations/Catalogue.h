@@ -36,6 +36,7 @@ struct CatalogueSource {
     std::uint32_t code;         ///< the log code, 0xFF0000 added for the extra stream
     const Field* field;         ///< place, format and meaning: a constant
     const List* list = nullptr; ///< whose entry the place counts from; null for the record itself
+    std::uint8_t subPacket = 0; ///< of the record, that the place counts from; 0 for the record itself
 };
 
 struct CatalogueField;
@@ -74,6 +75,7 @@ private:
     bool _isOpen = false;
     std::span<const std::string_view> _keys;
     std::vector<std::unique_ptr<CatalogueNode>> _children;
+    std::map<std::string_view, CatalogueNode*> _byName; ///< the children: a free tree may have very many
 };
 
 /// A leaf of the display: one row of the catalogue.

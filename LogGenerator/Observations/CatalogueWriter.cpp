@@ -20,7 +20,7 @@ void CatalogueWriter::fields(std::span<const Field> fields) {
 void CatalogueWriter::addTo(Catalogue::Node& node, const Field& field) {
     const List* const list = _levels.empty() ? nullptr : _levels.back().list;
     const bool isFirst = !node.leaf() || node.leaf()->sources.empty();
-    CatalogueField& leaf = _catalogue.add(node, _map.section(), {_code, &field, list});
+    CatalogueField& leaf = _catalogue.add(node, _map.section(), {_code, &field, list, _subPacket});
     // A second place for the same value of the same record: a role is that of the first.
     const CatalogueField& first = *_catalogue.firstOf(list, field, leaf);
     if (&first != &leaf && isFirst) {

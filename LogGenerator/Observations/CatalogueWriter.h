@@ -23,8 +23,12 @@ public:
         : _catalogue(catalogue), _map(map), _places(std::move(places)) {}
 
     /// What follows is read from records of that code.
-    void setCode(std::uint32_t code) { _code = code; }
+    void setCode(std::uint32_t code) {
+        _code = code;
+        _subPacket = 0;
+    }
 
+    void subPacket(std::uint8_t id) override { _subPacket = id; }
     void fields(std::span<const Field> fields) override;
     void beginList(const List& list) override;
     void endList() override;
@@ -40,6 +44,7 @@ private:
     FieldMap& _map;
     Places _places;
     std::uint32_t _code = 0;
+    std::uint8_t _subPacket = 0;
     std::vector<Level> _levels;
 };
 

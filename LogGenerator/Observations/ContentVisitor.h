@@ -5,6 +5,7 @@
 
 #include "LogGenerator/Fields/Field.h"
 
+#include <cstdint>
 #include <span>
 
 namespace velmora {
@@ -14,6 +15,9 @@ class ContentVisitor {
 public:
     virtual ~ContentVisitor() = default;
 
+    /// The places of what follows count from the record's sub-packet of that id; 0: from the record, as at
+    /// first. The default takes no notice.
+    virtual void subPacket(std::uint8_t /*id*/) {}
     virtual void fields(std::span<const Field> fields) = 0;
     virtual void beginList(const List& list) = 0;
     virtual void endList() = 0;

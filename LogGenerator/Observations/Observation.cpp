@@ -3,6 +3,7 @@
 
 #include "LogGenerator/Observations/Observation.h"
 
+#include <algorithm>
 #include <charconv>
 
 namespace velmora {
@@ -11,15 +12,15 @@ void Observation::appendPath(std::string& path) const {
     std::size_t row = 0;
     const std::string_view pattern = leaf->path;
     for (std::size_t at = 0; at < pattern.size();) {
-        const std::size_t star = row < rows.size() ? pattern.find("/*", at) : std::string_view::npos;
-        if (star == std::string_view::npos) {
-            path.append(pattern.substr(at));
-            return;
+        const std::size_t next = std::min(pattern.find('/', at + 1), pattern.size());
+        const std::string_view part = pattern.substr(at, next - at);
+        if (part == "/*" && row < rows.size()) {
+            char digits[16];
+            path.append("/").append(digits, std::to_chars(digits, digits + sizeof digits, rows[row++]).ptr);
+        } else {
+            path.append(part);
         }
-        path.append(pattern.substr(at, star + 1 - at));
-        char digits[16];
-        path.append(digits, std::to_chars(digits, digits + sizeof digits, rows[row++]).ptr);
-        at = star + 2;
+        at = next;
     }
 }
 

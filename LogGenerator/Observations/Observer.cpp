@@ -4,6 +4,7 @@
 #include "LogGenerator/Observations/Observer.h"
 
 #include "LogGenerator/Observations/TextNumber.h"
+#include "Platform/DateText.h"
 #include "PropertyLists/Value.h"
 
 #include <algorithm>
@@ -174,14 +175,37 @@ void Observer::supplied(const Field& field, const Value& value) {
     for (const FieldMap::Entry& entry : _map->find(currentList(), field)) {
         if (entry.source->code != _code)
             continue;
+        const std::size_t first = _observations.size();
         if (value.asDictionary() || value.asArray()) {
-            const std::size_t first = _observations.size();
             tree(_map->catalogue(), *entry.node, _map->section(), value);
             setKey(first, entry.node->keys());
         } else {
             leaf(*entry.node->leaf(), value);
         }
+        if (_levels.empty()) // the rows of a list go with the list
+            removeOthers(*entry.node, first);
     }
+}
+
+void Observer::removeOthers(const Catalogue::Node& node, std::size_t first) {
+    const auto shown = _observations.begin() + static_cast<std::ptrdiff_t>(first);
+    const CatalogueField* const leaf = node.leaf();
+    const auto isLeaf = [leaf](const Observation& each) { return each.leaf == leaf; };
+    if (leaf && std::none_of(shown, _observations.end(), isLeaf))
+        _removed.push_back(leaf);
+    for (const std::unique_ptr<Catalogue::Node>& child : node.children())
+        removeOthers(*child, first);
+}
+
+void Observer::display(Catalogue& catalogue, const Value& value) {
+    tree(catalogue, catalogue.root(), {}, value);
+    _displayed.assign(catalogue.fields().size(), false);
+    for (const Observation& each : _observations)
+        _displayed[each.leaf->index] = true;
+    for (std::size_t i = 0; i < _displayedBefore.size(); ++i)
+        if (_displayedBefore[i] && !_displayed[i])
+            _removed.push_back(&catalogue.fields()[i]);
+    std::swap(_displayed, _displayedBefore);
 }
 
 void Observer::leaf(const CatalogueField& leaf, const Value& value) {
@@ -200,14 +224,20 @@ void Observer::leaf(const CatalogueField& leaf, const Value& value) {
         observation.kind = ObservedKind::Number;
         observation.number = static_cast<double>(*integer);
         observation.given = _texts.add() = std::to_string(*integer);
-    } else if (const double* const number = value.asReal(); number && std::isfinite(*number)) {
+    } else if (const double* const number = value.asReal()) {
+        observation.given = _texts.add() = std::to_string(*number);
+        if (!std::isfinite(*number))
+            return; // absent
         observation.kind = ObservedKind::Number;
         observation.number = *number;
-        observation.given = _texts.add() = std::to_string(*number);
     } else if (const bool* const flag = value.asBoolean()) {
         observation.kind = ObservedKind::Flag;
         observation.raw = *flag ? 1 : 0;
         observation.given = *flag ? "true" : "false";
+    } else if (const Date* const date = value.asDate()) {
+        observation.kind = ObservedKind::Text;
+        observation.given = _texts.add() = dateAndTimeText(*date, " ");
+        observation.words = observation.given;
     } else if (const Data* const data = value.asData()) {
         observation.kind = ObservedKind::Binary;
         observation.bytes = data->bytes();

@@ -36,6 +36,9 @@ public:
     /// The leaves of a property list that is shown at the node.
     void tree(Catalogue& catalogue, Catalogue::Node& node, std::string_view section, const Value& value);
 
+    /// The same of the entire display: what an earlier one had and this one has not is removed.
+    void display(Catalogue& catalogue, const Value& value);
+
     void fields(const Record& record, const Layout& layout) override;
     void number(const Field& field, std::int64_t raw) override;
     void real(const Field& field, double value) override;
@@ -67,6 +70,9 @@ private:
     void setCode(const Field& field, std::string_view digits, Observation& observation) const;
     /// Sets what identifies the row of the observations from `first` on, by the leaves of these names.
     void setKey(std::size_t first, std::span<const std::string_view> names);
+    /// The leaves at the node and below it that none of the observations from that one on is of show nothing
+    /// any more.
+    void removeOthers(const Catalogue::Node& node, std::size_t first);
     /// A value of a list without rows begins.
     void beginValue();
     void newRow(std::uint32_t number);
@@ -79,6 +85,8 @@ private:
     std::vector<Observation> _observations;
     std::vector<ObservedList> _lists;
     std::vector<const CatalogueField*> _removed;
+    std::vector<bool> _displayed; ///< by index in the catalogue, see `display`
+    std::vector<bool> _displayedBefore;
     std::vector<Level> _levels;
     TextArena _texts;
     ObservedText _keyText;

@@ -13,7 +13,7 @@ constexpr std::size_t expectedLength = 15; // 0xD0E0
 constexpr Place version = u8At(13);
 
 constexpr std::int64_t knownVersion = 1;
-/// What the mode reads as in a record of another version.
+/// What the log shows as the mode of a record that lacks it.
 constexpr std::int64_t noMode = 255;
 
 /// RRC states (3GPP TS 25.331 7.1), with the modem's own numbers.
@@ -21,15 +21,13 @@ constexpr EnumText stateRows[] = {
     {0, "Disconnected"}, {1, "Connecting"}, {2, "Cell Fach"},
     {3, "Cell DCH"},     {4, "Cell PCH"},   {5, "Cell URA PCH"},
 };
-constexpr EnumTexts states(stateRows, "Unknown RRC Mode");
-constexpr Field state{
-    "State", u8At(14), text(states), {.role = Role::RadioState, .clause = "3GPP TS 25.331 7.1"}};
+constexpr std::string_view unknownMode = "Unknown RRC Mode";
+constexpr EnumTexts states(stateRows, unknownMode);
+constexpr Field state{"State",
+                      u8At(14),
+                      text(states),
+                      {.role = Role::RadioState, .absent = unknownMode, .clause = "3GPP TS 25.331 7.1"}};
 static_assert(state.place.end() <= expectedLength);
-
-/// The field of a record that may be too short for it.
-std::int64_t readOr(const Record& record, const Place& place, std::int64_t missing) {
-    return record.size() >= place.end() ? place.read(record) : missing;
-}
 
 /// A node on one line, as its log line shows it: {State = Cell DCH; Cells = (1, 2)}.
 std::string description(const Value& value) {
@@ -55,9 +53,13 @@ std::string description(const Value& value) {
     return "(null)";
 }
 
-/// The RRC mode; what the record lacks reads as version 0 and as no mode.
+/// Whether the record is of the known version and reaches to the mode.
+bool hasMode(const Record& record) {
+    return record.size() >= state.place.end() && version.read(record) == knownVersion;
+}
+
 std::int64_t modeOf(const Record& record) {
-    return readOr(record, version, 0) == knownVersion ? readOr(record, state.place, noMode) : noMode;
+    return hasMode(record) ? state.place.read(record) : noMode;
 }
 
 // A short record is decoded as well, see updateWithData.
@@ -94,7 +96,10 @@ void RRC_State::check(const View&, const Record& record) const {
 }
 
 void RRC_State::decode(const View&, const Record& record, FieldVisitor& visitor) const {
-    visitor.number(state, modeOf(record));
+    if (hasMode(record))
+        visitor.number(state, state.place.read(record));
+    else
+        visitor.text(state, unknownMode);
 }
 
 } // namespace velmora

@@ -85,13 +85,8 @@ std::size_t GzipSource::inflateInto(std::span<std::uint8_t> buffer) {
     stream.avail_out = clampedSize(buffer.size());
     const uInt room = stream.avail_out;
     while (_inMember && !_failure && stream.avail_out == room) {
-        if (!_input.ensure(1)) {
-            if (_input.failure())
-                _failure = _input.failure();
-            else
-                fail("gzip'd data that ends early");
-            break;
-        }
+        // At the end of the input there may be bytes left that had no room before.
+        const bool hasMore = _input.ensure(1);
         const Bytes packed = _input.available();
         stream.next_in = packed.data();
         stream.avail_in = clampedSize(packed.size());
@@ -100,17 +95,24 @@ std::size_t GzipSource::inflateInto(std::span<std::uint8_t> buffer) {
         _input.skip(offered - stream.avail_in);
         if (result == Z_MEM_ERROR)
             throw std::bad_alloc();
-        if (result != Z_OK && result != Z_STREAM_END)
-            fail(std::string("damaged gzip'd data (") + (stream.msg ? stream.msg : "no progress") + ")");
+        const bool hasProgress = stream.avail_out != room || stream.avail_in != offered;
+        if (result == Z_DATA_ERROR || result == Z_NEED_DICT || (hasMore && !hasProgress))
+            fail(std::string("damaged gzip'd data (") + (stream.msg ? stream.msg : "no progress") + ")",
+                 "near");
+        else if (!hasMore && !hasProgress && _input.failure())
+            _failure = _input.failure();
+        else if (!hasMore && !hasProgress && result != Z_STREAM_END)
+            fail("gzip'd data that ends early");
         _inMember = result != Z_STREAM_END;
     }
     return room - stream.avail_out;
 }
 
-/// The reader of the unpacked bytes adds their offset.
-void GzipSource::fail(const std::string& what) {
-    _failure =
-        Failure{what + ", at byte " + std::to_string(_input.offset()) + " of the file; unpacked it ends"};
+/// The reader of the unpacked bytes adds their offset. zlib notices damage a few bytes after it, how many
+/// depends on the sizes in which it gets the data.
+void GzipSource::fail(const std::string& what, const char* place) {
+    _failure = Failure{what + ", " + place + " byte " + std::to_string(_input.offset()) +
+                       " of the file; unpacked it ends"};
 }
 
 } // namespace velmora

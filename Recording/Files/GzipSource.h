@@ -34,7 +34,7 @@ private:
     [[nodiscard]] std::size_t inflateInto(std::span<std::uint8_t> buffer);
     /// Prepares for another member. Returns whether there is one.
     [[nodiscard]] bool beginMember();
-    void fail(const std::string& what);
+    void fail(const std::string& what, const char* place = "at");
 
     ChunkedInput _input;
     std::unique_ptr<Inflater> _inflater;

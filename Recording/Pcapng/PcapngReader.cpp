@@ -190,14 +190,15 @@ void PcapngReader::readMessage(const Block& block, std::optional<LoggedMessage>&
         passOn(block);
         return;
     }
-    if (interface != nullptr && interface->use == Use::OtherTechnology)
+    const bool isOther = interface != nullptr && (interface->use == Use::OtherTechnology ||
+                                                  (interface->technology != 0 && !_readsAllTechnologies));
+    if (isOther)
         passOn(block);
     const std::size_t room = block.length - 4;
     const bool whole = packet.offset <= room && packet.captured <= room - packet.offset &&
                        packet.captured == packet.original && packet.captured <= maximumMessageSize;
     std::optional<Time> time;
-    if (interface != nullptr && interface->use == Use::Messages && whole &&
-        (interface->technology == 0 || _readsAllTechnologies))
+    if (interface != nullptr && interface->use == Use::Messages && whole && !isOther)
         time = packet.hasStamp ? interface->description.time(packet.stamp) : _lastTime;
     if (!time) {
         // Thousands of these are possible; only those that are kept need a reason.

@@ -21,8 +21,8 @@ constexpr std::size_t flushThreshold = std::size_t{64} << 10;
 } // namespace
 
 RecordingCopy::RecordingCopy(PcapngReader& reader, std::unique_ptr<OutputFile> file, std::string name,
-                             std::string technology)
-    : _reader(reader), _file(std::move(file)), _name(std::move(name)), _technology(std::move(technology)) {
+                             Names names)
+    : _reader(reader), _file(std::move(file)), _name(std::move(name)), _names(std::move(names)) {
     reader.setOtherBlocks([this](const PcapngReader::Block& block) { addOther(block); });
 }
 
@@ -33,8 +33,8 @@ Result<Done> RecordingCopy::addMessage() {
 
 Result<Done> RecordingCopy::finish() {
     add({});
-    if (!_hasInterface && !_technology.empty())
-        pcapngBlocks::appendInterface(_buffer, _technology);
+    if (!_hasInterface && !_names.technology.empty())
+        pcapngBlocks::appendInterface(_buffer, _names.technology);
     flush();
     return _failure ? Result<Done>(*_failure) : Done{};
 }
@@ -54,13 +54,21 @@ void RecordingCopy::addInterface(const PcapngReader::Block& block) {
     const auto interface = InterfaceDescription::read(block.body(), block.bigEndian);
     const bool isOfMessages = interface && interface->linkType == pcapng::logMessageLinkType;
     _hasInterface = _hasInterface || isOfMessages;
-    const std::string_view name = isOfMessages ? shortTechnologyName(interface->name) : std::string_view();
-    // Interfaces of another technology, whose packets are no messages of the reader's, keep their names.
-    const bool isReaders = isOfMessages && (name.empty() || name == _reader.technology());
-    if (isReaders && !_technology.empty() && name != _technology)
-        add(pcapngCopy::renamedInterface(block, _technology));
+    const std::optional<std::string> name =
+        isOfMessages ? newName(shortTechnologyName(interface->name)) : std::nullopt;
+    if (name)
+        add(pcapngCopy::renamedInterface(block, *name));
     else
         add(block.bytes);
+}
+
+std::optional<std::string> RecordingCopy::newName(std::string_view name) const {
+    if (!_names.only.empty() && name != _names.only && !name.empty())
+        return std::string();
+    const bool isFirst = name.empty() || name == _reader.technology();
+    if (!_names.technology.empty() && name != _names.technology && isFirst)
+        return _names.technology;
+    return std::nullopt;
 }
 
 void RecordingCopy::add(Bytes bytes) {

@@ -11,6 +11,7 @@
 #include <memory>
 #include <optional>
 #include <string>
+#include <string_view>
 #include <vector>
 
 namespace velmora {
@@ -19,11 +20,18 @@ namespace velmora {
 /// them all that the reader passes on. Main thread only.
 class RecordingCopy {
 public:
-    /// Failures name the file `name`. `technology`, a short name, becomes that of the interfaces of the
-    /// reader's messages; empty: they keep theirs. Nothing has been read of `reader`, which must not be read
-    /// any more after this has been destroyed.
-    RecordingCopy(PcapngReader& reader, std::unique_ptr<OutputFile> file, std::string name,
-                  std::string technology = {});
+    /// The names of the interfaces of log messages in the copy; by default they keep theirs.
+    struct Names {
+        std::string technology =
+            {}; ///< a short name: that of the interfaces of the reader's first technology
+        /// A short name: interfaces of other technologies, whose messages are not added, lose their names, so
+        /// that the copy has this technology alone.
+        std::string only = {};
+    };
+
+    /// Failures name the file `name`. Nothing has been read of `reader`, which must not be read any more
+    /// after this has been destroyed.
+    RecordingCopy(PcapngReader& reader, std::unique_ptr<OutputFile> file, std::string name, Names names);
 
     /// Adds the message that the reader last returned.
     Result<Done> addMessage();
@@ -35,11 +43,13 @@ private:
     void addInterface(const PcapngReader::Block& block);
     void add(Bytes bytes);
     void flush();
+    /// The name in the copy of an interface of messages; absent where it keeps its own.
+    [[nodiscard]] std::optional<std::string> newName(std::string_view name) const;
 
     PcapngReader& _reader;
     std::unique_ptr<OutputFile> _file;
     std::string _name;
-    std::string _technology;
+    Names _names;
     std::vector<std::uint8_t> _buffer;
     bool _hasSection = false;   ///< a section header has been added
     bool _hasInterface = false; ///< an interface of messages has been added

@@ -5,6 +5,9 @@
 
 _velmora_technologies=(IFX Ostrel_GSM Ostrel_CDMA Ostrel_LTE Ostrel_UTRAN2)
 
+_velmora_roles=(serving serving.{mcc,mnc,area,cell,channel,physical-cell,level,quality} neighbour
+    neighbour.{channel,physical-cell,level,quality} registration.state radio.state block-error-rate data-rate)
+
 # Offers those of the words that begin as the present one does.
 _velmora_offer() {
     local word
@@ -103,7 +106,7 @@ _velmora_log() {
     for ((i = 1; i < cword; ++i)); do
         case ${words[i]} in
         --log | --log-level | --format | --every | --select | --from | --to | --code | --technology | --jobs | \
-            --max-age | --duration | --count | --timeout | --description)
+            --max-age | --duration | --count | --timeout | --description | --role)
             ((++i))
             ;;
         -?*) ;;
@@ -118,7 +121,15 @@ _velmora_log() {
     done
     case $prev in
     --format)
-        _velmora_offer text json jsonl csv
+        case $command in
+        info) _velmora_offer text json ;;
+        fields) _velmora_offer text json csv ;;
+        *) _velmora_offer text json jsonl csv ;;
+        esac
+        return
+        ;;
+    --role)
+        _velmora_offer "${_velmora_roles[@]}"
         return
         ;;
     --every)
@@ -145,7 +156,7 @@ _velmora_log() {
         if [[ $cur == -* ]]; then
             _velmora_offer "${options[@]}" --version
         else
-            _velmora_offer decode watch record convert info
+            _velmora_offer decode watch record convert info fields
         fi
         return
         ;;
@@ -153,7 +164,8 @@ _velmora_log() {
     watch) options+=(--once --timeout) ;;
     record) options+=(--force --duration --count --timeout) ;;
     convert) options+=(--force --from --to --code --technology --description --strict) ;;
-    info) options+=(--technology) ;;
+    info) options+=(--format --technology) ;;
+    fields) options+=(--technology --role --format) ;;
     esac
     if [[ $cur == -* ]]; then
         _velmora_offer "${options[@]}"
@@ -161,7 +173,7 @@ _velmora_log() {
     fi
     # As many files as the command takes.
     case $command:$files in
-    decode:* | record:0 | convert:[01] | info:0) _filedir '@(pcapng|velmora|dlf)' ;;
+    decode:* | info:* | record:0 | convert:[01]) _filedir '@(pcapng|velmora|dlf)' ;;
     esac
 }
 

@@ -34,6 +34,8 @@ public:
 
     /// When the drive begins by the records' time stamps.
     [[nodiscard]] static Time startTime();
+    /// Seconds from the start to the end of the last step, whose messages `next` returns.
+    [[nodiscard]] double now() const { return _now; }
 
 protected:
     /// A phase of the round starts with a procedure of the scenario `Kind`, where it has one, and lasts
@@ -63,8 +65,6 @@ protected:
     /// element `number` modulo their count.
     [[nodiscard]] virtual UnusualMessageParts unusualMessageParts(std::size_t number) = 0;
 
-    /// Seconds from the start.
-    [[nodiscard]] double now() const { return _now; }
     [[nodiscard]] ScenarioRandom& random() { return _random; }
     /// The remaining steps of the procedures.
     [[nodiscard]] DriveScript& script() { return _script; }

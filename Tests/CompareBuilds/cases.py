@@ -3,6 +3,7 @@
 """The commands that an input is tried with."""
 
 import json
+import re
 import subprocess
 from collections.abc import Iterator
 from pathlib import Path
@@ -31,11 +32,12 @@ def leaves(value: Any, path: str = "") -> Iterator[str]:
 
 
 def columns(display: str) -> list[str]:
-    """Of the display's values some from its beginning to its end, two groups, and one that is not there."""
+    """Of the display's values some from its beginning to its end, two groups, and a row that is not there."""
     found = list(leaves(json.loads(display)["display"]))
     spread = found[:: max(1, len(found) // COLUMNS)]
     groups = sorted({path.rpartition("/")[0] for path in found} - {""})
-    return spread + groups[:1] + groups[-1:] + ["/None/Such"]
+    missing = [re.sub(r"/\d+(?=/|$)", "/4095", path, count=1) for path in found if re.search(r"/\d+(/|$)", path)]
+    return spread + groups[:1] + groups[-1:] + missing[:1]
 
 
 def selected(paths: list[str]) -> tuple[str, ...]:

@@ -42,20 +42,25 @@ def first_difference(before: Path, after: Path) -> str:
 
 
 class Comparison:
-    def __init__(self, before: Path, after: Path, keep: Path | None) -> None:
+    def __init__(self, before: Path, after: Path, keep: Path | None, ignored: frozenset[str] = frozenset()) -> None:
         self.before, self.after = before, after
         self._keep = keep
+        self._ignored = ignored
         self._lock = threading.Lock()
         self.count = self.differing = 0
 
     def compare(self, case: Case) -> None:
-        one, other = run(self.before, case), run(self.after, case)
+        one, other = (self._compared(run(build, case)) for build in (self.before, self.after))
         with self._lock:
             self.count += 1
         if one != other:
             with self._lock:
                 self.differing += 1
                 self._report(case, one, other)
+
+    def _compared(self, outcome: Outcome) -> Outcome:
+        digests = {name: digest for name, digest in outcome.digests.items() if name not in self._ignored}
+        return Outcome(outcome.status, digests)
 
     def note(self, what: str, one: bytes, other: bytes) -> None:
         """Compares what has been gathered already."""

@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: MIT
 
 #include "LogGenerator/LogGenerator.h"
+#include "LogGenerator/Observations/Observation.h"
 #include "Platform/SystemLog.h"
 #include "Telephony/Drives/ScenarioRegistry.h"
 #include "Tests/Memory/Allocations.h"
@@ -17,7 +18,7 @@
 #include <string>
 #include <vector>
 
-// A decoder that has seen a drive decodes it again without allocating anything.
+// A decoder that has seen a drive decodes it again without allocating anything, observed or not.
 
 namespace velmora {
 namespace {
@@ -87,6 +88,34 @@ protected:
 TEST_P(SteadyStateTest, UpdatesAllocateNothing) {
     EXPECT_GT(allocationsOfDrive(), 100u);
     EXPECT_EQ(allocationsOfDrive(), 0u);
+}
+
+/// Takes all that there is to an observation, and keeps none of it.
+class CountingSink final : public ObservationSink {
+public:
+    void observed(const ObservedMessage& message) override {
+        observations += message.observations.size();
+        for (const Observation& each : message.observations)
+            characters += _text.of(each).size() + each.rowKey.size();
+    }
+
+    std::size_t observations = 0;
+    std::size_t characters = 0;
+
+private:
+    ObservedText _text;
+};
+
+TEST_P(SteadyStateTest, ObservationsAllocateNothing) {
+    CountingSink sink;
+    decoder->setObservationSink(&sink);
+    EXPECT_GT(allocationsOfDrive(), 100u);
+    const std::size_t observations = sink.observations;
+    EXPECT_EQ(allocationsOfDrive(), 0u);
+    EXPECT_GT(observations, messages.size());
+    // Not exactly as many: some values count from an earlier record.
+    EXPECT_GT(sink.observations, 2 * observations - messages.size() / 100);
+    decoder->setObservationSink(nullptr);
 }
 
 INSTANTIATE_TEST_SUITE_P(Drives, SteadyStateTest,

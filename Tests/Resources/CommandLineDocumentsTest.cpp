@@ -1,6 +1,7 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
+#include "LogGenerator/Fields/Role.h"
 #include "Platform/TelephonyService.h"
 #include "Telephony/Drives/ScenarioRegistry.h"
 #include "Tests/Resources/DissectorSections.h"
@@ -193,6 +194,14 @@ TEST_F(Completion, offersTheValuesOfOptions) {
     }
 }
 
+TEST_F(Completion, offersRoles) {
+    Words roles = {"serving", "neighbour"};
+    for (const RoleName& row : roleNames())
+        roles.insert(std::string(row.name));
+    EXPECT_EQ(offered("velmora-log fields --role "), roles);
+    EXPECT_EQ(offered("velmora-log fields --role=radio"), Words{"radio.state"});
+}
+
 TEST_F(Completion, offersSources) {
     const std::string line = "velmora-telephonyd --source ";
     const HelpText help = helpOf("velmora-telephonyd");
@@ -245,8 +254,10 @@ TEST_F(Completion, offersFiles) {
     EXPECT_EQ(offered("velmora-log info " + folder + "g"), gsm);
     EXPECT_EQ(offered("velmora-log decode - " + folder + "g"), gsm);
     EXPECT_EQ(offered("velmora-log --log-level 4 convert a.dlf " + folder + "g"), gsm);
-    EXPECT_EQ(offered("velmora-log info a.dlf " + folder + "g"), Words{}) << "it takes one file";
+    EXPECT_EQ(offered("velmora-log info a.dlf " + folder + "g"), gsm);
+    EXPECT_EQ(offered("velmora-log record a.pcapng " + folder + "g"), Words{}) << "it takes one file";
     EXPECT_EQ(offered("velmora-log watch " + folder + "g"), Words{}) << "it takes none";
+    EXPECT_EQ(offered("velmora-log fields " + folder + "g"), Words{}) << "it takes none";
     EXPECT_EQ(offered("velmora-log decode --select " + folder + "g"), Words{}) << "no file belongs there";
     EXPECT_EQ(offered("velmora-telephonyd --source replay:" + folder + "gsm.p"), gsm);
     EXPECT_EQ(offered("velmora --sysroot " VELMORA_SOURCE_DIR "/Tests/Recordin"),

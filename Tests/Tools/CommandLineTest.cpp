@@ -168,12 +168,17 @@ TEST(CommandLineTest, ConvertTakesWhatTheNewFileIsToBe) {
     EXPECT_EQ(plain->description, "");
 }
 
-TEST(CommandLineTest, InfoTakesAFileAndATechnology) {
-    const CommandLine line = parse({"info", "a.dlf", "--technology", "Ostrel_LTE"});
+TEST(CommandLineTest, InfoTakesFilesFormatAndTechnology) {
+    const CommandLine line = parse({"info", "a.dlf", "--technology", "Ostrel_LTE", "--format", "json", "-"});
     const auto* info = std::get_if<InfoOptions>(&line.command);
     ASSERT_NE(info, nullptr);
-    EXPECT_EQ(info->file, "a.dlf");
+    EXPECT_THAT(info->files, ElementsAre("a.dlf", "-"));
     EXPECT_EQ(info->technology, "Ostrel_LTE");
+    EXPECT_EQ(info->format, InfoOptions::Format::Json);
+    const CommandLine plainLine = parse({"info", "a.dlf"});
+    const auto* plain = std::get_if<InfoOptions>(&plainLine.command);
+    ASSERT_NE(plain, nullptr);
+    EXPECT_EQ(plain->format, InfoOptions::Format::Text);
 }
 
 TEST(CommandLineTest, TechnologiesHaveShortFormsInAnyCase) {
@@ -201,14 +206,31 @@ TEST(CommandLineTest, TechnologiesHaveShortFormsInAnyCase) {
     }
 }
 
+TEST(CommandLineTest, FieldsTakesATechnologyARoleAndAFormat) {
+    const CommandLine line =
+        parse({"fields", "--technology", "Ostrel_LTE", "--role", "serving", "--format", "csv"});
+    const auto* fields = std::get_if<FieldsOptions>(&line.command);
+    ASSERT_NE(fields, nullptr);
+    EXPECT_EQ(fields->technology, "Ostrel_LTE");
+    EXPECT_TRUE(fields->roles.contains(Role::ServingLevel));
+    EXPECT_FALSE(fields->roles.contains(Role::NeighbourLevel));
+    EXPECT_EQ(fields->format, FieldsOptions::Format::Csv);
+    const CommandLine plainLine = parse({"fields"});
+    const auto* plain = std::get_if<FieldsOptions>(&plainLine.command);
+    ASSERT_NE(plain, nullptr);
+    EXPECT_EQ(plain->technology, "");
+    EXPECT_TRUE(plain->roles.isEverything());
+    EXPECT_EQ(plain->format, FieldsOptions::Format::Text);
+}
+
 TEST(CommandLineTest, UsageErrorsGiveTheFoundAndTheExpectedValue) {
     struct Case {
         std::vector<const char*> arguments;
         std::string message;
     };
     const Case cases[] = {
-        {{}, "no command, wanted decode, watch, record, convert or info"},
-        {{"bogus"}, "got bogus, wanted one of the commands decode, watch, record, convert and info"},
+        {{}, "no command, wanted decode, watch, record, convert, info or fields"},
+        {{"bogus"}, "got bogus, wanted one of the commands decode, watch, record, convert, info and fields"},
         {{"decode"}, "FILE is required"},
         {{"decode", "--format", "xml", "a"}, "--format: got xml, wanted text or json or jsonl or csv"},
         {{"decode", "--every", "day", "a"}, "--every: got day, wanted refresh or message"},
@@ -260,7 +282,16 @@ TEST(CommandLineTest, UsageErrorsGiveTheFoundAndTheExpectedValue) {
         {{"convert", "--technology", "Ostrel_XYZ", "a", "b.dlf"},
          "--technology: got Ostrel_XYZ, wanted one of " + technologies},
         {{"info", "--technology", "", "a"}, "--technology: got , wanted one of " + technologies},
-        {{"info", "a", "b"}, "The following argument was not expected: b"},
+        {{"info"}, "FILE is required"},
+        {{"info", "--format", "jsonl", "a"}, "--format: got jsonl, wanted text or json"},
+        {{"fields", "a"}, "The following argument was not expected: a"},
+        {{"fields", "--format", "jsonl"}, "--format: got jsonl, wanted text or json or csv"},
+        {{"fields", "--technology", "5G"}, "--technology: got 5G, wanted one of " + technologies},
+        {{"fields", "--role", "level"},
+         "--role: got level, wanted one of serving.mcc, serving.mnc, serving.area, serving.cell, "
+         "serving.channel, serving.physical-cell, serving.level, serving.quality, neighbour.channel, "
+         "neighbour.physical-cell, neighbour.level, neighbour.quality, registration.state, radio.state, "
+         "block-error-rate, data-rate, or the part before a dot"},
         {{"watch", "--log-level", "8"}, "--log-level: got 8, wanted a number from 0 to 7"},
         {{"--log", "file", "watch"}, "--log: got file, wanted syslog or stderr"},
     };
@@ -284,6 +315,7 @@ TEST_F(CommandLineProgramTest, EveryHelpTextShowsAnExampleOnStandardOutput) {
         {{"record", "--help"}, "\n  velmora-log record drive.pcapng\n"},
         {{"convert", "--help"}, "\n  velmora-log record - | velmora-log convert - drive.dlf\n"},
         {{"info", "--help"}, "\n  velmora-log info drive.pcapng\n"},
+        {{"fields", "--help"}, "\n  velmora-log fields --role serving\n"},
     };
     for (const auto& [arguments, example] : cases) {
         ToolProcess process(tool(arguments));

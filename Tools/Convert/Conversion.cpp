@@ -79,14 +79,22 @@ Result<int> ownDescriptor(int descriptor, const std::string& name) {
 
 /// A recording of a recording: what is not known here is kept.
 Result<bool> copyRecording(PcapngReader& reader, const Conversion& conversion, int descriptor) {
+    // The first blocks are copied before the first message is read.
+    const std::vector<std::string> technologies = knownTechnologies(conversion.technologies, reader);
+    const Result<TechnologyChoice> choice = TechnologyChoice::make(conversion.technology, technologies);
+    if (!choice)
+        return Failure{conversion.title + ": " + choice.reason()};
     RecordingCopy copy(reader, std::make_unique<DescriptorFile>(descriptor, false), conversion.name,
-                       std::string(shortTechnologyName(conversion.technology)));
+                       {choice->override, choice->only ? technologies[*choice->only] : std::string()});
     Result<Messages> messages = begin(reader, conversion);
     if (!messages)
         return Failure{messages.reason()};
     for (; messages->next; messages->advance())
         if (const auto added = copy.addMessage(); !added)
             return Failure{added.reason()};
+    if (!choice->override.empty() && reader.technologies().size() > 1)
+        return Failure{conversion.title + ": " + severalTechnologies(reader.technologies()) +
+                       " of a regular file only"};
     if (const auto finished = copy.finish(); !finished)
         return Failure{finished.reason()};
     return true;

@@ -72,7 +72,10 @@ void FileDecoding::take(const LoggedMessage& message) {
         return;
     }
     const Technology& technology = at(message.technology);
-    refreshBefore(message);
+    if (_technologies.size() > 1)
+        refreshAllBefore(message);
+    else if (const std::optional<Time> tick = technology.decoder->refreshBefore(message))
+        technology.decoder->refresh(*tick);
     _context.atRecord(message.number, message.offset);
     if (technology.decoder)
         technology.decoder->decode(message);
@@ -80,9 +83,8 @@ void FileDecoding::take(const LoggedMessage& message) {
         _shared.undecoded.add(message, technology.reason);
 }
 
-FileDecoding::Technology& FileDecoding::at(std::uint32_t index) {
-    if (index < _technologies.size() &&
-        (_technologies[index].decoder || !_technologies[index].reason.empty()))
+FileDecoding::Technology& FileDecoding::make(std::uint32_t index) {
+    if (index < _technologies.size() && !_technologies[index].reason.empty())
         return _technologies[index];
     if (index >= _technologies.size())
         _technologies.resize(index + 1);
@@ -99,13 +101,7 @@ FileDecoding::Technology& FileDecoding::at(std::uint32_t index) {
 }
 
 /// Where the technologies are refreshed one by one, the order is that of the time.
-void FileDecoding::refreshBefore(const LoggedMessage& message) {
-    if (_technologies.size() == 1) {
-        TechnologyDecoder& decoder = *_technologies.front().decoder;
-        if (const std::optional<Time> tick = decoder.refreshBefore(message))
-            decoder.refresh(*tick);
-        return;
-    }
+void FileDecoding::refreshAllBefore(const LoggedMessage& message) {
     for (std::size_t i = 0; i < _technologies.size(); ++i) {
         TechnologyDecoder* const decoder = _technologies[i].decoder.get();
         if (!decoder)

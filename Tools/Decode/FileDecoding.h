@@ -40,8 +40,12 @@ private:
     [[nodiscard]] Result<Done> begin();
     void take(const LoggedMessage& message);
     /// The technology of that index, whose decoder is made on its first message.
-    [[nodiscard]] Technology& at(std::uint32_t technology);
-    void refreshBefore(const LoggedMessage& message);
+    [[nodiscard]] Technology& at(std::uint32_t index) {
+        return index < _technologies.size() && _technologies[index].decoder ? _technologies[index]
+                                                                            : make(index);
+    }
+    [[nodiscard]] Technology& make(std::uint32_t index);
+    void refreshAllBefore(const LoggedMessage& message);
     void refreshDue();
     void noteSeveral();
     [[nodiscard]] DecodedFile finish();

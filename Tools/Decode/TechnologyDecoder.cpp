@@ -3,8 +3,6 @@
 
 #include "Tools/Decode/TechnologyDecoder.h"
 
-#include "LogGenerator/Extra/ExtraPayload.h"
-#include "LogGenerator/GSM/AssertionFailure.h"
 #include "Platform/TelephonyService.h"
 #include "Tools/Technologies.h"
 
@@ -55,57 +53,11 @@ void TechnologyDecoder::refresh(Time tick) {
     }
 }
 
-void TechnologyDecoder::decode(const LoggedMessage& message) {
-    _clock.setNow(message.time);
-    const bool writes = _shared.filter.writes(message.time);
-    if (writes) {
-        announce();
-        _shared.observer.willDecode(message);
-    }
-    std::optional<std::string> reason = update(message, writes ? _shared.effects : nullptr);
-    ++_decoded.messages;
-    if (reason)
-        _shared.undecoded.add(message, *std::move(reason));
-    else if (writes)
-        _shared.observer.didDecode(message, *_decoder, _state);
-    if (const std::optional<Time> tick = _refreshes.after(message))
-        refresh(*tick);
-}
-
-std::optional<std::string> TechnologyDecoder::update(const LoggedMessage& message, MessageEffects* effects) {
-    if (_shared.isStrict) {
-        callOn(message, effects);
-        return std::nullopt;
-    }
-    try {
-        callOn(message, effects);
-        return std::nullopt;
-    } catch (const LogCode_0xFF0000::UnknownDataException& failure) {
-        return failure.what();
-    } catch (const AssertionFailure& failure) {
-        return failure.what();
-    }
-}
-
-void TechnologyDecoder::callOn(const LoggedMessage& message, MessageEffects* effects) {
-    if (effects)
-        _decoder->updateStateReporting(_state, message.message, *effects);
-    else
-        _decoder->updateState(_state, message.message);
-}
-
 void TechnologyDecoder::finish() {
     if (_refreshes.count() != 0 && !_keepsHistory)
         _decoded.display = _decoder->display(_state);
     announce();
     _shared.observer.didFinish(*_decoder, _state);
-}
-
-void TechnologyDecoder::announce() {
-    if (_shared.observed == this)
-        return;
-    _shared.observed = this;
-    _shared.observer.willConcern(_decoded);
 }
 
 } // namespace velmora

@@ -3,6 +3,8 @@
 
 #pragma once
 
+#include "LogGenerator/Extra/ExtraPayload.h"
+#include "LogGenerator/GSM/AssertionFailure.h"
 #include "LogGenerator/LogGenerator.h"
 #include "PropertyLists/Value.h"
 #include "Tools/Decode/Decoding.h"
@@ -62,8 +64,6 @@ public:
 private:
     TechnologyDecoder(const std::string& technology, SharedDecoding& shared);
 
-    /// Why the message could not be decoded; absent where it was.
-    [[nodiscard]] std::optional<std::string> update(const LoggedMessage& message, MessageEffects* effects);
     void callOn(const LoggedMessage& message, MessageEffects* effects);
     /// Says which technology the observer's next calls concern.
     void announce();
@@ -76,5 +76,50 @@ private:
     Decoded _decoded;
     bool _keepsHistory = false;
 };
+
+// Here, since there are millions of messages: the calls would show.
+
+inline void TechnologyDecoder::announce() {
+    if (_shared.observed == this)
+        return;
+    _shared.observed = this;
+    _shared.observer.willConcern(_decoded);
+}
+
+inline void TechnologyDecoder::callOn(const LoggedMessage& message, MessageEffects* effects) {
+    if (effects)
+        _decoder->updateStateReporting(_state, message.message, *effects);
+    else
+        _decoder->updateState(_state, message.message);
+}
+
+inline void TechnologyDecoder::decode(const LoggedMessage& message) {
+    _clock.setNow(message.time);
+    const bool writes = _shared.filter.writes(message.time);
+    if (writes) {
+        announce();
+        _shared.observer.willDecode(message);
+    }
+    MessageEffects* const effects = writes ? _shared.effects : nullptr;
+    bool isDecoded = true;
+    if (_shared.isStrict) {
+        callOn(message, effects);
+    } else {
+        try {
+            callOn(message, effects);
+        } catch (const LogCode_0xFF0000::UnknownDataException& failure) {
+            _shared.undecoded.add(message, failure.what());
+            isDecoded = false;
+        } catch (const AssertionFailure& failure) {
+            _shared.undecoded.add(message, failure.what());
+            isDecoded = false;
+        }
+    }
+    ++_decoded.messages;
+    if (isDecoded && writes)
+        _shared.observer.didDecode(message, *_decoder, _state);
+    if (const std::optional<Time> tick = _refreshes.after(message))
+        refresh(*tick);
+}
 
 } // namespace velmora

@@ -3,91 +3,64 @@
 
 #include "Tools/Info/InfoCommand.h"
 
-#include "LogGenerator/C2K/C2KLogGenerator.h"
-#include "LogGenerator/C2K/LogCodeParsers.h"
-#include "LogGenerator/OstrelLogGenerator2.h"
-#include "Platform/TelephonyService.h"
 #include "Recording/OpenMessages.h"
 #include "Tools/Decode/Decoding.h"
-#include "Tools/Decode/RefreshTicks.h"
 #include "Tools/ExitStatus.h"
-#include "Tools/Info/MessageSummary.h"
+#include "Tools/Info/InfoCollector.h"
+#include "Tools/Info/InfoJSON.h"
+#include "Tools/Info/InfoText.h"
 #include "Tools/Output.h"
 #include "Tools/Report.h"
-#include "Tools/Technologies.h"
+#include "Tools/Text/PrintableText.h"
 
-#include <algorithm>
+#include <cstddef>
 #include <memory>
-#include <optional>
-#include <string_view>
-#include <vector>
 
 namespace velmora {
 
 namespace {
 
-/// The sections that want the code, each once.
-std::string sectionsOf(const ClassIndex& index, std::uint32_t code) {
-    const std::vector<Base*>* sections = index.getSubscribers(code);
-    std::vector<std::string_view> names;
-    if (sections)
-        for (const Base* section : *sections)
-            if (std::find(names.begin(), names.end(), section->getSectionName()) == names.end())
-                names.push_back(section->getSectionName());
-    std::string text;
-    for (const std::string_view name : names) {
-        text += text.empty() ? "" : ", ";
-        text += name;
+/// Returns whether all of the file was read and understood.
+bool showFile(std::size_t index, const InfoOptions& options, Output& output) {
+    const std::string& path = options.files[index];
+    const std::string title = fileTitle(path);
+    std::vector<std::string> technologies;
+    if (!options.technology.empty())
+        technologies = technologiesOf(path);
+    const Result<std::unique_ptr<MessageReader>> opened = openMessages(path);
+    if (!opened) {
+        report(title + ": " + opened.reason());
+        return false;
     }
-    return text;
-}
+    MessageReader& reader = **opened;
+    InfoCollector collector(reader, technologies);
+    if (const Result<Done> collected = collector.collect(options.technology); !collected) {
+        report(title + ": " + collected.reason());
+        return false;
+    }
+    if (options.format == InfoOptions::Format::Json) {
+        output.put(infoJson(path, collector.info(), reader));
+    } else {
+        if (options.files.size() > 1)
+            output.put((index > 0 ? "\n== " : "== ") + printable(title) + " ==\n");
+        output.put(infoText(collector.info(), reader));
+    }
+    output.flush();
 
-/// `decoder` may be null; it is used for as long as the names are.
-CodeNames codeNames(const LogGenerator* decoder) {
-    CodeNames names;
-    if (const auto* withSections = dynamic_cast<const OstrelLogGenerator2*>(decoder))
-        names.nameOf = [withSections](std::uint32_t code) {
-            return sectionsOf(withSections->classIndex(), code);
-        };
-    if (dynamic_cast<const C2KLogGenerator*>(decoder)) {
-        names.heading = "records";
-        names.nameOf = [](std::uint32_t code) {
-            const C2K::LogCodeParser* parser = C2K::parserOfCode(code);
-            return std::string(parser ? parser->name() : std::string_view());
-        };
-    }
-    return names;
+    for (const std::string& reason : collector.missingDecoders())
+        report(title + ": " + reason);
+    const bool allDecoded = collector.info().undecoded.report(title);
+    const bool whole = reportLosses(reader, title);
+    return whole && allDecoded && collector.missingDecoders().empty();
 }
 
 } // namespace
 
 int runInfo(const InfoOptions& options, Output& output) {
-    const std::string title = fileTitle(options.file);
-    const Result<std::unique_ptr<MessageReader>> opened = openMessages(options.file);
-    if (!opened) {
-        report(title + ": " + opened.reason());
-        return ExitStatus::BadInput;
-    }
-    MessageReader& reader = **opened;
-    // The first message before the technology: a file may name it no earlier than there.
-    std::optional<LoggedMessage> message = reader.next();
-    const std::string technology = options.technology.empty() ? reader.technology() : options.technology;
-    MessageSummary summary(technologyConstant(technology) != kVoxLogChannelTechnology_IFX);
-    for (; message; message = reader.next())
-        summary.add(*message);
-
-    // Only for its sections' names: a recording without a decoder gets its summary as well.
-    const MessageClock clock;
-    const Result<std::unique_ptr<LogGenerator>> decoder = makeDecoder(technology, clock);
-    const CodeNames names = codeNames(decoder ? decoder->get() : nullptr);
-    output.put(summaryText(summary, technology, names, reader));
-    output.flush();
-
-    if (!decoder)
-        report(title + ": " + decoder.reason());
-    const bool whole = reportLosses(reader, title);
-    return whole && decoder && output.state() != Output::State::Failed ? ExitStatus::Done
-                                                                       : ExitStatus::BadInput;
+    bool good = true;
+    for (std::size_t index = 0; index < options.files.size() && output.isOpen(); ++index)
+        good = showFile(index, options, output) && good;
+    return good && output.state() != Output::State::Failed ? ExitStatus::Done : ExitStatus::BadInput;
 }
 
 } // namespace velmora

@@ -4,6 +4,7 @@
 #pragma once
 
 #include <string>
+#include <vector>
 
 namespace CLI {
 class App;
@@ -11,10 +12,13 @@ class App;
 
 namespace velmora {
 
-/// `velmora-log info`: what a file of log messages holds, and its damage.
+/// `velmora-log info`: what files of log messages hold, and their damage.
 struct InfoOptions {
-    std::string file;
-    std::string technology; ///< overrides the file's; empty for the file's
+    enum class Format { Text, Json };
+
+    Format format = Format::Text;
+    std::string technology; ///< overrides the file's, or chooses one of several; empty for the file's
+    std::vector<std::string> files;
 };
 
 /// Adds the command with its options, help and examples. Parsing fills `options`, which must outlive `app`.

@@ -7,10 +7,8 @@
 #include "Recording/MessageReader.h"
 
 #include <cstdint>
-#include <functional>
 #include <map>
 #include <optional>
-#include <string>
 
 namespace velmora {
 
@@ -28,7 +26,10 @@ public:
     /// are not.
     explicit MessageSummary(bool binary) : _binary(binary) {}
 
-    void add(const LoggedMessage& message);
+    /// Returns the log code, of a message that has one.
+    std::optional<std::uint32_t> add(const LoggedMessage& message);
+    /// The message that was added last cannot be decoded.
+    void addUndecoded(const LoggedMessage& message);
 
     [[nodiscard]] bool isBinary() const { return _binary; }
     [[nodiscard]] std::uint64_t messages() const { return _messages; }
@@ -42,6 +43,8 @@ public:
     [[nodiscard]] const Count& tooShort() const { return _tooShort; }
     /// Of a type byte that is neither stream's, which decoders drop.
     [[nodiscard]] const Count& wrongType() const { return _wrongType; }
+    /// Messages that end the application.
+    [[nodiscard]] const Count& undecoded() const { return _undecoded; }
     /// With the two bytes before the record that decoders strip: not malformed.
     [[nodiscard]] const Count& prefixed() const { return _prefixed; }
 
@@ -55,17 +58,7 @@ private:
     Count _tooShort;
     Count _wrongType;
     Count _prefixed;
+    Count _undecoded;
 };
-
-/// A technology's names of log codes.
-struct CodeNames {
-    const char* heading = "sections";
-    /// Returns an empty text for a code without subscriber. Null without a decoder.
-    std::function<std::string(std::uint32_t code)> nameOf;
-};
-
-/// The summary as `info` prints it.
-[[nodiscard]] std::string summaryText(const MessageSummary& summary, const std::string& technology,
-                                      const CodeNames& names, const MessageReader& reader);
 
 } // namespace velmora

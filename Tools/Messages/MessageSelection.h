@@ -25,15 +25,22 @@ struct MessageSelection {
 /// Applies a selection to the messages of a file, which it gets from the first one on.
 class MessageFilter {
 public:
-    explicit MessageFilter(MessageSelection selection) : _selection(std::move(selection)) {}
+    explicit MessageFilter(MessageSelection selection)
+        : _selection(std::move(selection)), _passesAll(_selection.codes.empty() && !_selection.range.from &&
+                                                       !_selection.range.to) {}
 
     /// From now on only messages of the technology of that index are selected.
-    void setTechnology(std::uint32_t technology) { _technology = technology; }
+    void setTechnology(std::uint32_t technology) {
+        _technology = technology;
+        _passesAll = false;
+    }
 
     /// Whether the message is to be decoded. Call it once for each message of the file, in order.
     [[nodiscard]] bool passes(const LoggedMessage& message) {
         if (!_first)
             _first = message.time;
+        if (_passesAll)
+            return true;
         return (!_technology || message.technology == *_technology) &&
                decodedRange().contains(message.time, *_first) &&
                (_selection.codes.empty() || hasCode(message));
@@ -53,6 +60,7 @@ private:
     MessageSelection _selection;
     std::optional<Time> _first; ///< the time of the file's first message
     std::optional<std::uint32_t> _technology;
+    bool _passesAll; ///< which is most often so, and asked for millions of times
 };
 
 } // namespace velmora

@@ -136,9 +136,13 @@ void OneXStatus::decode(const Reading& reading, FieldVisitor& visitor) const {
 }
 
 void OneXStatus::describe(ContentVisitor& visitor) const {
+    visitor.subPacket(systemState);
     describeFields(systemStateFields, visitor);
+    visitor.subPacket(radioFrequency);
     describeFields(radioFields, visitor);
+    visitor.subPacket(activeSet);
     visitor.list(ActiveSetInfo::pilotList);
+    visitor.subPacket(0);
     visitor.field(oldFrameErrorRate);
 }
 

@@ -24,13 +24,15 @@ constexpr Field measuredFields[] = {
 constexpr Layout measured = layout(14, measuredFields);
 constexpr Place measuredARFCN = measuredFields[0].place;
 
-// 0x51FF: the BSIC (3GPP TS 23.003 4.3.2) of an ARFCN.
+// 0x51FF: the BSIC (3GPP TS 23.003 4.3.2) of an ARFCN. It is shown with the cells of 0x5137, whose records do
+// not hold it.
 constexpr std::size_t bsicMinimumLength = 15;
 constexpr std::size_t bsicEntryLength = 4;
 constexpr Place bsicARFCN = u16At(0);
+constexpr Place bsicOfARFCN = u8At(2);
 constexpr Field bsic{
-    "BSIC", u8At(2), integer("%d"), {.role = Role::NeighbourPhysicalCell, .clause = "3GPP TS 23.003 4.3.2"}};
-static_assert(bsicARFCN.end() <= bsicEntryLength && bsic.place.end() <= bsicEntryLength);
+    "BSIC", computed, integer("%d"), {.role = Role::NeighbourPhysicalCell, .clause = "3GPP TS 23.003 4.3.2"}};
+static_assert(bsicARFCN.end() <= bsicEntryLength && bsicOfARFCN.end() <= bsicEntryLength);
 
 // As the telephony service reports it: twice its number is the level in dBm.
 constexpr CellField serviceFields[] = {
@@ -127,7 +129,7 @@ void NeighboringCells::decode(const View& view, const Record& record, FieldVisit
         // Of an ARFCN that is listed twice, the later entry counts.
         for (std::size_t j = knownBSICs.count(); j-- > 0;)
             if (bsicARFCN.read(knownBSICs[j]) == measuredARFCN.read(cells[i])) {
-                visitor.number(bsic, bsic.place.read(knownBSICs[j]));
+                visitor.number(bsic, bsicOfARFCN.read(knownBSICs[j]));
                 break;
             }
         visitor.endRow();

@@ -34,6 +34,10 @@ public:
     explicit C2KScenario(std::uint64_t seed);
     [[nodiscard]] std::string_view technology() const override;
 
+    /// What the messages are of: the phone and the cells around it after the last step.
+    [[nodiscard]] const C2KPhone& phone() const { return _phone; }
+    [[nodiscard]] const C2KNetwork& network() const { return _network; }
+
 private:
     static const Phase phases[];
 

@@ -36,6 +36,10 @@ public:
     explicit GSMScenario(std::uint64_t seed);
     [[nodiscard]] std::string_view technology() const override;
 
+    /// What the messages are of: the phone and the cells around it after the last step.
+    [[nodiscard]] const GSMPhone& phone() const { return _phone; }
+    [[nodiscard]] const RadioNetwork& network() const { return _network; }
+
 private:
     static const Phase phases[];
 

@@ -34,6 +34,10 @@ public:
     [[nodiscard]] std::string_view technology() const override;
     [[nodiscard]] ScenarioEvent next() override;
 
+    /// What the last message was of: the phone and the cells around it.
+    [[nodiscard]] const IFXPhone& phone() const { return _phone; }
+    [[nodiscard]] const RadioNetwork& network() const { return _network; }
+
 private:
     void followTimeline();
     void camp();

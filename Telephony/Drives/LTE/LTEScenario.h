@@ -37,6 +37,10 @@ public:
     explicit LTEScenario(std::uint64_t seed);
     [[nodiscard]] std::string_view technology() const override;
 
+    /// What the messages are of: the phone and the cells around it after the last step.
+    [[nodiscard]] const LTEPhone& phone() const { return _phone; }
+    [[nodiscard]] const LTENetwork& network() const { return _network; }
+
 private:
     static const Phase phases[];
 

@@ -33,6 +33,10 @@ public:
     explicit UTRANScenario(std::uint64_t seed);
     [[nodiscard]] std::string_view technology() const override;
 
+    /// What the messages are of: the phone and the cells around it after the last step.
+    [[nodiscard]] const UTRANPhone& phone() const { return _phone; }
+    [[nodiscard]] const UTRANNetwork& network() const { return _network; }
+
 private:
     static const Phase phases[];
 

@@ -58,6 +58,23 @@ TEST_F(CatalogueTest, ALeafIsWhatItsTableSays) {
     EXPECT_EQ(catalogue.fields()[2].kind, ObservedKind::Enumeration);
 }
 
+TEST_F(CatalogueTest, APlaceMayCountFromASubPacket) {
+    CatalogueWriter writer(catalogue, map, [this](std::string_view label) {
+        return std::vector<Catalogue::Node*>{&catalogue.root().child(label)};
+    });
+    writer.setCode(0x119C);
+    writer.subPacket(2);
+    writer.field(level);
+    writer.subPacket(0);
+    writer.field(area);
+    writer.subPacket(3);
+    writer.setCode(0x119D); // another record
+    writer.field(state);
+    EXPECT_EQ(leaf("/RSSI").sources[0].subPacket, 2u);
+    EXPECT_EQ(leaf("/LAC").sources[0].subPacket, 0u);
+    EXPECT_EQ(leaf("/State").sources[0].subPacket, 0u);
+}
+
 TEST_F(CatalogueTest, TwoRecordsOfALabelAreOneLeafOfTwoSources) {
     const Content measured[] = {level};
     const Content service[] = {serviceLevel};

@@ -71,6 +71,14 @@ protected:
         return lines;
     }
 
+    /// The paths of the leaves that show nothing any more.
+    [[nodiscard]] std::vector<std::string> removed() const {
+        std::vector<std::string> paths;
+        for (const CatalogueField* const each : observer.message(Time(), std::nullopt, std::nullopt).removed)
+            paths.push_back(each->path);
+        return paths;
+    }
+
     Catalogue catalogue{"Test"};
     FieldMap map{catalogue, "Section"};
     Observer observer;

@@ -6,6 +6,9 @@
 
 #include <gmock/gmock.h>
 
+#include <chrono>
+#include <limits>
+
 namespace velmora {
 namespace {
 
@@ -56,6 +59,26 @@ TEST_F(SuppliedTest, ABooleanIsAFlag) {
     EXPECT_EQ(textOf(only()), "true");
 }
 
+TEST_F(SuppliedTest, ARealIsANumber) {
+    supply(2.5);
+    EXPECT_EQ(only().kind, ObservedKind::Number);
+    EXPECT_EQ(only().number, 2.5);
+    EXPECT_EQ(textOf(only()), "2.500000");
+}
+
+TEST_F(SuppliedTest, ARealThatIsNotFiniteIsAbsent) {
+    supply(std::numeric_limits<double>::infinity());
+    EXPECT_EQ(only().kind, ObservedKind::Absent);
+    EXPECT_EQ(textOf(only()), "inf");
+}
+
+TEST_F(SuppliedTest, ADateIsAText) {
+    using namespace std::chrono;
+    supply(Date(sys_days{year{2026} / January / 5} + 8h));
+    EXPECT_EQ(only().kind, ObservedKind::Text);
+    EXPECT_EQ(only().words, "2026-01-05 08:00:00");
+}
+
 TEST_F(SuppliedTest, DataIsBytes) {
     const Data bytes = hex("89 01");
     supply(bytes);
@@ -73,6 +96,19 @@ TEST_F(SuppliedTest, ATreeIsObservedLeafByLeaf) {
     ASSERT_EQ(message.lists.size(), 1u);
     EXPECT_EQ(message.lists[0].list->path(), "/Section/File/Networks");
     EXPECT_EQ(message.lists[0].rows, 2u);
+}
+
+TEST_F(SuppliedTest, WhatATreeLacksIsRemoved) {
+    supply(dictionary({{"LAI", "00F110"}, {"TMSI", "01020304"}}));
+    EXPECT_THAT(removed(), ElementsAre("/Section/File"));
+    observer.beginMessage();
+    ASSERT_TRUE(observer.beginSection(map, code));
+    observer.supplied(file, dictionary({{"TMSI", "05060708"}}));
+    EXPECT_THAT(removed(), ElementsAre("/Section/File", "/Section/File/LAI"));
+    observer.beginMessage();
+    ASSERT_TRUE(observer.beginSection(map, code));
+    observer.supplied(file, "text");
+    EXPECT_THAT(removed(), ElementsAre("/Section/File/LAI", "/Section/File/TMSI"));
 }
 
 TEST_F(SuppliedTest, ANewLeafEntersTheCatalogueOnce) {
@@ -100,7 +136,7 @@ TEST_F(SuppliedTest, RowsOfAListHaveTheirIndexAndKey) {
 
 class TreeTest : public ObservationFixture {
 protected:
-    void show(const Value& value) { observer.tree(catalogue, catalogue.root(), {}, value); }
+    void show(const Value& value) { observer.display(catalogue, value); }
 };
 
 TEST_F(TreeTest, NumbersAreReadFromTextsWhereThereIsNothingElse) {
@@ -129,6 +165,33 @@ TEST_F(TreeTest, ANumberInAnotherUnitIsAbsent) {
     show(dictionary({{"RxLev", "none"}}));
     EXPECT_EQ(only().kind, ObservedKind::Absent);
     EXPECT_EQ(textOf(only()), "none");
+}
+
+// Their number must not square the time.
+TEST_F(TreeTest, ADisplayMayHaveVeryManyLabels) {
+    const DictionaryRef many = makeDictionary();
+    constexpr int count = 100'000;
+    for (int i = 0; i < count; ++i)
+        many->set("Label " + std::to_string(i), "1");
+    show(many);
+    EXPECT_EQ(observations().size(), static_cast<std::size_t>(count));
+    EXPECT_EQ(observations().back().leaf->path, "/Label 99999");
+}
+
+TEST_F(TreeTest, OnlyAKeyThatIsAStarNamesRows) {
+    show(dictionary({{"*b", array({dictionary({{"c*", "1"}})})}}));
+    EXPECT_THAT(shown(), ElementsAre("/*b/0/c* [] 1"));
+}
+
+TEST_F(TreeTest, WhatTheNextDisplayLacksIsRemoved) {
+    show(dictionary({{"State", "Call"}, {"Channel", dictionary({{"ARFCN", "62"}, {"HSN", "1"}})}}));
+    EXPECT_THAT(removed(), ElementsAre());
+    observer.beginMessage();
+    show(dictionary({{"State", "Idle"}, {"Channel", "None"}}));
+    EXPECT_THAT(removed(), ElementsAre("/Channel/ARFCN", "/Channel/HSN"));
+    observer.beginMessage();
+    show(dictionary({{"State", "Idle"}, {"Channel", "None"}}));
+    EXPECT_THAT(removed(), ElementsAre());
 }
 
 TEST_F(TreeTest, ElsewhereTextsStayTexts) {

@@ -224,30 +224,6 @@ TEST_F(DecodeCommandTest, RecordsThatDecodersDropAreNoBadInput) {
     EXPECT_THAT(process.errors(), HasSubstr("<3>Invalid log type: 2. Dropping.\n"));
 }
 
-TEST_F(DecodeCommandTest, UnreadableSimFilesEndTheStrictProgramWithTheirMessage) {
-    const std::vector<std::uint64_t> offsets = writeRecording(
-        "sim.pcapng", "Ostrel_GSM",
-        {{at(0), rrState(5)}, {at(1), record(0x0000, "DE AD BE EF", 0xFF)}, {at(2), rrState(4)}});
-    writeDrive("drive.pcapng");
-    ToolProcess process(tool({"decode", "--strict", path("drive.pcapng"), path("sim.pcapng")}));
-    EXPECT_EQ(process.exitStatus(), 1);
-    EXPECT_EQ(process.output(), "== " + path("drive.pcapng") + " ==\n" + idleText);
-    EXPECT_EQ(ownMessages(process.errors()), "velmora-log: " + path("sim.pcapng") + ": record 2 at offset " +
-                                                 std::to_string(offsets[1]) +
-                                                 ": SIM File dictionary data could not be constructed\n");
-}
-
-TEST_F(DecodeCommandTest, UnreadableSerializedObjectEndsTheStrictProgramWithItsMessage) {
-    const std::vector<std::uint64_t> offsets =
-        writeRecording("ifx.pcapng", "IFX", {{at(0), hex("00 01 02 03")}});
-    ToolProcess process(tool({"decode", "--strict", path("ifx.pcapng")}));
-    EXPECT_EQ(process.exitStatus(), 1);
-    EXPECT_EQ(process.output(), "");
-    EXPECT_THAT(ownMessages(process.errors()),
-                testing::StartsWith("velmora-log: " + path("ifx.pcapng") + ": record 1 at offset " +
-                                    std::to_string(offsets[0]) + ": "));
-}
-
 TEST_F(DecodeCommandTest, ClosedPipeEndsItQuietly) {
     // More than a pipe holds, so that writing meets the closed end.
     const DictionaryRef display = makeDictionary();
@@ -305,18 +281,6 @@ TEST_F(DecodeCommandTest, DecoderLinesAreSummedUpUnlessVerbose) {
         EXPECT_EQ(several.exitStatus(), 0);
         EXPECT_EQ(several.errors(), both) << jobs;
     }
-}
-
-TEST_F(DecodeCommandTest, ADecoderThatEndsTheProgramHasItsLinesSummedUpBefore) {
-    const std::vector<std::uint64_t> offsets = writeRecording(
-        "sim.pcapng", "Ostrel_GSM",
-        {{at(0), record(0x512C, "04 00 01 00", 2)}, {at(1), record(0x0000, "DE AD BE EF", 0xFF)}});
-    ToolProcess process(tool({"decode", path("sim.pcapng")}));
-    EXPECT_EQ(process.exitStatus(), 1);
-    EXPECT_THAT(process.errors(), testing::StartsWith("<3>Invalid log type: 2. Dropping.\n"));
-    EXPECT_THAT(process.errors(), testing::EndsWith("velmora-log: " + path("sim.pcapng") +
-                                                    ": record 2 at offset " + std::to_string(offsets[1]) +
-                                                    ": SIM File dictionary data could not be constructed\n"));
 }
 
 TEST_F(DecodeCommandTest, LogLevelDecidesWhichLinesAreWritten) {

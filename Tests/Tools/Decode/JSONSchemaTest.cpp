@@ -3,6 +3,7 @@
 
 #include "Platform/TelephonyService.h"
 #include "Telephony/Drives/ScenarioRegistry.h"
+#include "Tests/Tools/CheckedJSON.h"
 #include "Tests/Tools/ToolFixture.h"
 
 #include <gmock/gmock.h>
@@ -46,17 +47,7 @@ protected:
     }
 
     /// How many objects the text holds; the checker's complaint where one is wrong.
-    static std::string check(const std::string& text) {
-        ToolProcess::Setup setup;
-        setup.arguments = {VELMORA_SOURCE_DIR "/Tests/Tools/Decode/check-json.py",
-                           VELMORA_SOURCE_DIR "/Resources/velmora-log.schema.json"};
-        setup.input = text;
-        setup.environment = {{"LD_PRELOAD", ""}};
-        ToolProcess checker(setup, "/usr/bin/python3");
-        const std::optional<int> status = checker.exitStatus();
-        return status == 0 ? checker.output()
-                           : "status " + testing::PrintToString(status) + ": " + checker.errors();
-    }
+    static std::string check(const std::string& text) { return checkJSON("velmora-log.schema.json", text); }
 };
 
 /// A part of the technology's displays that is in a list where it has one.

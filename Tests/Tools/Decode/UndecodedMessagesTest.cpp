@@ -105,5 +105,43 @@ TEST_F(UndecodedMessagesTest, FirstHundredAreReportedOneByOne) {
                                            ": 103 messages could not be decoded\n"));
 }
 
+TEST_F(UndecodedMessagesTest, UnreadableSimFilesEndTheStrictProgramWithTheirMessage) {
+    const std::vector<std::uint64_t> offsets = writeRecording(
+        "sim.pcapng", "Ostrel_GSM",
+        {{at(0), rrState(5)}, {at(1), record(0x0000, "DE AD BE EF", 0xFF)}, {at(2), rrState(4)}});
+    writeRecording("drive.pcapng", "Ostrel_GSM", {{at(0), rrState(4)}, {at(1000), rrState(5)}});
+    ToolProcess process(tool({"decode", "--strict", path("drive.pcapng"), path("sim.pcapng")}));
+    EXPECT_EQ(process.exitStatus(), 1);
+    EXPECT_EQ(process.output(), "== " + path("drive.pcapng") + " ==\n" +
+                                    "GSM RR Info\n  RR State      RR_IDLE\n  RR Sub State  0\n"
+                                    "  RR Status     1\n  RR Mode       Voice\nUMTS RR Info\nSIM Info\n");
+    EXPECT_EQ(ownMessages(process.errors()), "velmora-log: " + path("sim.pcapng") + ": record 2 at offset " +
+                                                 std::to_string(offsets[1]) +
+                                                 ": SIM File dictionary data could not be constructed\n");
+}
+
+TEST_F(UndecodedMessagesTest, UnreadableSerializedObjectEndsTheStrictProgramWithItsMessage) {
+    const std::vector<std::uint64_t> offsets =
+        writeRecording("ifx.pcapng", "IFX", {{at(0), hex("00 01 02 03")}});
+    ToolProcess process(tool({"decode", "--strict", path("ifx.pcapng")}));
+    EXPECT_EQ(process.exitStatus(), 1);
+    EXPECT_EQ(process.output(), "");
+    EXPECT_THAT(ownMessages(process.errors()),
+                testing::StartsWith("velmora-log: " + path("ifx.pcapng") + ": record 1 at offset " +
+                                    std::to_string(offsets[0]) + ": "));
+}
+
+TEST_F(UndecodedMessagesTest, ADecoderThatEndsTheProgramHasItsLinesSummedUpBefore) {
+    const std::vector<std::uint64_t> offsets = writeRecording(
+        "sim.pcapng", "Ostrel_GSM",
+        {{at(0), record(0x512C, "04 00 01 00", 2)}, {at(1), record(0x0000, "DE AD BE EF", 0xFF)}});
+    ToolProcess process(tool({"decode", "--strict", path("sim.pcapng")}));
+    EXPECT_EQ(process.exitStatus(), 1);
+    EXPECT_THAT(process.errors(), testing::StartsWith("<3>Invalid log type: 2. Dropping.\n"));
+    EXPECT_THAT(process.errors(), testing::EndsWith("velmora-log: " + path("sim.pcapng") +
+                                                    ": record 2 at offset " + std::to_string(offsets[1]) +
+                                                    ": SIM File dictionary data could not be constructed\n"));
+}
+
 } // namespace
 } // namespace velmora

@@ -93,7 +93,8 @@ TEST_F(InfoCommandTest, GzippedFilesAreListedAsWhatTheyUnpackTo) {
 }
 
 TEST_F(InfoCommandTest, SerializedObjectsHaveNoLogCodes) {
-    writeRecording("ifx.pcapng", "IFX", {{at(0), hex("01 02 03")}});
+    const Data message = serialized("idle");
+    writeRecording("ifx.pcapng", "IFX", {{at(0), message}});
     ToolProcess process(tool({"info", path("ifx.pcapng")}));
     EXPECT_EQ(process.exitStatus(), 0);
     EXPECT_EQ(process.output(), "form:       recording\n"
@@ -102,8 +103,8 @@ TEST_F(InfoCommandTest, SerializedObjectsHaveNoLogCodes) {
                                 "last:       2026-11-16 05:00:00.000 UTC\n"
                                 "duration:   0.000 s\n"
                                 "messages:   1\n"
-                                "bytes:      3\n"
-                                "lost:       0\n");
+                                "bytes:      " +
+                                    std::to_string(message.size()) + "\nlost:       0\n");
 }
 
 TEST_F(InfoCommandTest, LossIsShownAndMakesTheInputBad) {

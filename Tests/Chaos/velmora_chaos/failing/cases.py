@@ -25,6 +25,7 @@ def all_cases() -> list[Case]:
         decode_case("ifx as jsonl", ["--format", "jsonl"], "ifx.pcapng"),
         decode_case("two side by side", ["--jobs", "2"], "utran.pcapng", "lte.pcapng"),
         Case("info", ["info", str(RECORDINGS / "utran.pcapng")]),
+        Case("fields", ["fields", "--format", "json"]),
         ConvertCase("gsm.pcapng", "drive.pcapng", had=False),
         ConvertCase("gsm.pcapng", "drive.pcapng", had=True),
         ConvertCase("c2k.pcapng", "drive.dlf", had=False),

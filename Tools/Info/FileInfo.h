@@ -1,0 +1,37 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include "Recording/MessageReader.h"
+#include "Tools/Decode/UndecodedMessages.h"
+#include "Tools/Info/MessageSummary.h"
+
+#include <cstdint>
+#include <functional>
+#include <string>
+#include <vector>
+
+namespace velmora {
+
+/// A technology's names of log codes.
+struct CodeNames {
+    const char* heading = "sections";
+    /// Returns the names of a code, none for one without subscriber. Null without a decoder.
+    std::function<std::vector<std::string>(std::uint32_t code)> namesOf;
+};
+
+/// What a file holds of one technology.
+struct TechnologyInfo {
+    std::string name; ///< empty where the file does not say it
+    MessageSummary summary;
+    CodeNames names;
+};
+
+/// What a file holds, beside what its reader says.
+struct FileInfo {
+    std::vector<TechnologyInfo> technologies; ///< in the file's order; at least one
+    UndecodedMessages undecoded;
+};
+
+} // namespace velmora

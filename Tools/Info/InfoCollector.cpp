@@ -1,0 +1,143 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
+#include "Tools/Info/InfoCollector.h"
+
+#include "LogGenerator/C2K/C2KLogGenerator.h"
+#include "LogGenerator/C2K/LogCodeParsers.h"
+#include "LogGenerator/Extra/ExtraPayload.h"
+#include "LogGenerator/GSM/AssertionFailure.h"
+#include "LogGenerator/GSM/GSMLogGenerator.h"
+#include "LogGenerator/OstrelLogGenerator2.h"
+#include "LogMessages/LogMessage.h"
+#include "Platform/TelephonyService.h"
+#include "Tools/Technologies.h"
+
+#include <algorithm>
+#include <optional>
+#include <utility>
+
+namespace velmora {
+
+namespace {
+
+/// The sections that want the code, each once.
+std::vector<std::string> sectionsOf(const ClassIndex& index, std::uint32_t code) {
+    const std::vector<Base*>* sections = index.getSubscribers(code);
+    std::vector<std::string> names;
+    if (sections)
+        for (const Base* section : *sections)
+            if (std::find(names.begin(), names.end(), section->getSectionName()) == names.end())
+                names.emplace_back(section->getSectionName());
+    return names;
+}
+
+/// `decoder` may be null; it is used for as long as the names are.
+CodeNames codeNames(const LogGenerator* decoder) {
+    CodeNames names;
+    if (const auto* withSections = dynamic_cast<const OstrelLogGenerator2*>(decoder))
+        names.namesOf = [withSections](std::uint32_t code) {
+            return sectionsOf(withSections->classIndex(), code);
+        };
+    if (dynamic_cast<const C2KLogGenerator*>(decoder)) {
+        names.heading = "records";
+        names.namesOf = [](std::uint32_t code) {
+            const C2K::LogCodeParser* parser = C2K::parserOfCode(code);
+            return parser ? std::vector<std::string>{std::string(parser->name())}
+                          : std::vector<std::string>();
+        };
+    }
+    return names;
+}
+
+/// Why the message ends the application; absent where it does not. `code`: its log code, if it has one.
+std::optional<std::string> reasonNotDecoded(LogGenerator& decoder, Dictionary& state, PayloadCache& payloads,
+                                            const Data& message, std::optional<std::uint32_t> code) {
+    try {
+        if (dynamic_cast<GSMLogGenerator*>(&decoder)) {
+            decoder.updateState(state, message);
+        } else if (code == ExtraCode::simFiles) {
+            const auto* const withSections = dynamic_cast<OstrelLogGenerator2*>(&decoder);
+            if (withSections && withSections->classIndex().getSubscribers(*code)) {
+                const bool prefixed = LogMessage::parse(message.bytes())->prefixed;
+                const LogCode_0xFF0000::SIMFileReader files(
+                    prefixed ? message.from(LogMessage::prefixLength) : message, payloads);
+            }
+        }
+    } catch (const LogCode_0xFF0000::UnknownDataException& failure) {
+        return failure.what();
+    } catch (const AssertionFailure& failure) {
+        return failure.what();
+    }
+    return std::nullopt;
+}
+
+} // namespace
+
+Result<Done> InfoCollector::collect(const std::string& technology) {
+    _reader.setReadsAllTechnologies(true);
+    // The first message before the technology: a file may name it no earlier than there.
+    std::optional<LoggedMessage> message = _reader.next();
+    if (const Result<Done> chosen = choose(technology); !chosen)
+        return chosen;
+    startUpTo(0);
+    for (; message; message = _reader.next())
+        add(*message);
+    if (const std::size_t count = _reader.technologies().size();
+        _choice.override.empty() && !_choice.only && count > 1)
+        startUpTo(count - 1);
+    return Done{};
+}
+
+Result<Done> InfoCollector::choose(const std::string& technology) {
+    if (!technology.empty() && !isTechnology(technology)) {
+        _choice.override = technology; // counted all the same
+    } else {
+        Result<TechnologyChoice> choice =
+            TechnologyChoice::make(technology, knownTechnologies(_beforehand, _reader));
+        if (!choice)
+            return Failure{choice.reason()};
+        _choice = *std::move(choice);
+    }
+    if (!_choice.override.empty())
+        _reader.setReadsAllTechnologies(false);
+    return Done{};
+}
+
+void InfoCollector::startUpTo(std::size_t technology) {
+    const std::vector<std::string> names = knownTechnologies(_beforehand, _reader);
+    while (_info.technologies.size() <= technology)
+        start(_choice.nameOf(_choice.only.value_or(static_cast<std::uint32_t>(_info.technologies.size())),
+                             names));
+}
+
+void InfoCollector::start(const std::string& name) {
+    auto decoding = std::make_unique<Decoding>();
+    Result<std::unique_ptr<LogGenerator>> decoder = makeDecoder(name, _clock);
+    if (decoder)
+        decoding->decoder = *std::move(decoder);
+    else
+        _missing.push_back(decoder.reason());
+    const bool isBinary = technologyConstant(name) != kVoxLogChannelTechnology_IFX;
+    _info.technologies.push_back({name, MessageSummary(isBinary), codeNames(decoding->decoder.get())});
+    _decodings.push_back(std::move(decoding));
+}
+
+void InfoCollector::add(const LoggedMessage& message) {
+    if (_choice.only && message.technology != *_choice.only)
+        return;
+    const std::size_t index = _choice.only ? 0 : message.technology;
+    startUpTo(index);
+    MessageSummary& summary = _info.technologies[index].summary;
+    const std::optional<std::uint32_t> code = summary.add(message);
+    Decoding& decoding = *_decodings[index];
+    if (!decoding.decoder)
+        return;
+    if (std::optional<std::string> reason =
+            reasonNotDecoded(*decoding.decoder, decoding.state, decoding.payloads, message.message, code)) {
+        summary.addUndecoded(message);
+        _info.undecoded.add(message, *std::move(reason));
+    }
+}
+
+} // namespace velmora
