@@ -61,6 +61,9 @@ public:
     /// Who gets the observations of every message from now on; null for nobody, when nothing is computed for
     /// them. The sink must outlive the decoder or the next call.
     void setObservationSink(ObservationSink* sink);
+    /// When the latest record of a section arrived, since there is a sink: how old what it shows is. Absent
+    /// where none has, and for what is no section.
+    [[nodiscard]] virtual std::optional<Time> latestRecord(std::string_view /*section*/) const { return {}; }
 
     /// A new decoder for the technology that the telephony service names by one of its constants; null for
     /// any other name, and where the decoder cannot be made.

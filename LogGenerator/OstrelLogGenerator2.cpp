@@ -247,6 +247,11 @@ void OstrelLogGenerator2::observe(Observer* observer) {
     }
 }
 
+std::optional<Time> OstrelLogGenerator2::latestRecord(std::string_view section) const {
+    const auto map = _fieldMaps.find(cIndex->getClass(section));
+    return map == _fieldMaps.end() ? std::nullopt : map->second.latestRecord();
+}
+
 void OstrelLogGenerator2::printDict(const Value& object) const {
     if (object.asString())
         return;

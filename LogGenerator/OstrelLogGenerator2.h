@@ -36,6 +36,7 @@ public:
     [[nodiscard]] Value generateLogUsingState(Dictionary& state) override;
     [[nodiscard]] Value display(Dictionary& state) override;
     [[nodiscard]] DictionaryRef getStartCommand() const override;
+    [[nodiscard]] std::optional<Time> latestRecord(std::string_view section) const override;
 
     /// Frames one message and routes its record. A message below 13 bytes as it arrived is dropped silently;
     /// a prefix (first byte 0x81, two bytes) is removed; so a prefixed message of 13 bytes has a record of

@@ -4,8 +4,10 @@
 #pragma once
 
 #include "LogGenerator/Observations/Catalogue.h"
+#include "Platform/Clock.h"
 
 #include <cstddef>
+#include <optional>
 #include <span>
 #include <string>
 #include <vector>
@@ -41,6 +43,10 @@ public:
 
     void add(const Entry& entry) { _entries.push_back(entry); }
     void add(const ListEntry& entry) { _lists.push_back(entry); }
+    /// When the section's latest record arrived, since its records are observed; absent where none has.
+    [[nodiscard]] const std::optional<Time>& latestRecord() const { return _latestRecord; }
+    void setLatestRecord(Time arrival) const { _latestRecord = arrival; }
+
     /// Call it when all have been added, before anything is looked up.
     void sort();
 
@@ -56,7 +62,8 @@ private:
     std::string _section;
     std::vector<Entry> _entries; ///< by list and field
     std::vector<ListEntry> _lists;
-    mutable std::size_t _expected = 0; ///< the entry that follows the one found last
+    mutable std::optional<Time> _latestRecord; ///< no part of what the map says of the section
+    mutable std::size_t _expected = 0;         ///< the entry that follows the one found last
 };
 
 } // namespace velmora

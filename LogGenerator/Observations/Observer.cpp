@@ -91,6 +91,8 @@ bool Observer::beginSection(const FieldMap& map, std::uint32_t code) {
 
 ObservedMessage Observer::message(Time arrival, std::optional<std::uint32_t> code,
                                   std::optional<std::uint64_t> timestamp) const {
+    for (const auto& [map, recordCode] : _sections)
+        map->setLatestRecord(arrival);
     return {_messages, arrival, code, timestamp, _observations, _lists, _removed};
 }
 

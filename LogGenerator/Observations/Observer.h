@@ -29,7 +29,7 @@ public:
     /// The fields of a section follow, from a record of that code. False where the section has named that
     /// record's fields already: a code that is subscribed twice is observed once.
     [[nodiscard]] bool beginSection(const FieldMap& map, std::uint32_t code);
-    /// All of the message, as it arrived at that time.
+    /// All of the message, as it arrived at that time, which is that of its sections' latest record.
     [[nodiscard]] ObservedMessage message(Time arrival, std::optional<std::uint32_t> code,
                                           std::optional<std::uint64_t> timestamp) const;
 

@@ -47,6 +47,7 @@ public:
     }
 
     [[nodiscard]] LogGenerator& decoder() { return *_decoder; }
+    [[nodiscard]] FakeClock& clock() { return _clock; }
 
     Dictionary state;
 };

@@ -93,6 +93,21 @@ TEST_F(SinkTest, AfterAnUnreadableSIMFileItGoesOn) {
     EXPECT_EQ(sink.observations, 1u);
 }
 
+TEST_F(SinkTest, TheAgeOfASectionIsThatOfItsLatestRecord) {
+    using namespace std::chrono_literals;
+    update(record(0xD0E0, "01 04"));
+    EXPECT_EQ(tested.decoder().latestRecord("RRC Info"), std::nullopt); // nobody observes it
+    tested.decoder().setObservationSink(&sink);
+    tested.clock().advance(1s);
+    update(record(0xD0E0, "01 03"));
+    const Time latest = tested.clock().now();
+    tested.clock().advance(1s);
+    update(record(0x1234, "01 03"));
+    EXPECT_EQ(tested.decoder().latestRecord("RRC Info"), latest);
+    EXPECT_EQ(tested.decoder().latestRecord("Serving Cell Info"), std::nullopt);
+    EXPECT_EQ(tested.decoder().latestRecord("No Section"), std::nullopt);
+}
+
 TEST_F(SinkTest, TheCatalogueStaysTheSame) {
     Catalogue& catalogue = tested.decoder().catalogue();
     EXPECT_EQ(catalogue.technology(), "Ostrel_UTRAN2");
