@@ -65,7 +65,8 @@ private:
 /// with up to 60 characters around it.
 class NumberText {
 public:
-    NumberText() {} // the storage is not initialized
+    // The storage is not initialized, which a defaulted constructor may do.
+    NumberText() {} // NOLINT(modernize-use-equals-default)
     NumberText(const NumberFormat& format, std::int64_t value) { this->format(format, value); }
     NumberText(const NumberFormat& format, double value) { this->format(format, value); }
 

@@ -11,6 +11,6 @@ class DecoderLines;
 class Output;
 
 /// `velmora-log decode`. The exit status. An error in one file does not prevent decoding the others.
-[[nodiscard]] int runDecode(const DecodeOptions& options, DecoderLines& lines, Output& output);
+[[nodiscard]] int runDecode(const DecodeOptions& given, DecoderLines& lines, Output& output);
 
 } // namespace velmora

@@ -26,8 +26,8 @@ struct MessageSelection {
 class MessageFilter {
 public:
     explicit MessageFilter(MessageSelection selection)
-        : _selection(std::move(selection)), _passesAll(_selection.codes.empty() && !_selection.range.from &&
-                                                       !_selection.range.to) {}
+        : _selection(std::move(selection)),
+          _passesAll(_selection.codes.empty() && !_selection.range.from && !_selection.range.to) {}
 
     /// From now on only messages of the technology of that index are selected.
     void setTechnology(std::uint32_t technology) {
