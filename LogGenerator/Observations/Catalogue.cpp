@@ -68,6 +68,10 @@ CatalogueNode& CatalogueNode::child(std::string_view name) {
         return *found;
     CatalogueNode& made = *_children.emplace_back(std::make_unique<CatalogueNode>(name, this));
     _byName.emplace(made._name, &made);
+    CatalogueNode* root = this;
+    while (root->_parent)
+        root = root->_parent;
+    ++root->_count;
     return made;
 }
 

@@ -62,6 +62,8 @@ public:
     [[nodiscard]] bool isOpen() const { return _isOpen; }
     void setOpen() { _isOpen = true; }
     [[nodiscard]] const std::vector<std::unique_ptr<CatalogueNode>>& children() const { return _children; }
+    /// How many nodes there are below the root. Of the root alone.
+    [[nodiscard]] std::size_t count() const { return _count; }
     /// Of a list's rows: the names of the leaves that identify one.
     [[nodiscard]] std::span<const std::string_view> keys() const { return _keys; }
     /// The names must be constants.
@@ -73,6 +75,7 @@ private:
     CatalogueNode* _parent;
     CatalogueField* _leaf = nullptr;
     bool _isOpen = false;
+    std::size_t _count = 0;
     std::span<const std::string_view> _keys;
     std::vector<std::unique_ptr<CatalogueNode>> _children;
     std::map<std::string_view, CatalogueNode*> _byName; ///< the children: a free tree may have very many
@@ -117,6 +120,11 @@ public:
     CatalogueField& leafAt(Node& node, std::string_view section);
     /// Adds a source to the leaf at the node, which is made from the first one.
     CatalogueField& add(Node& node, std::string_view section, const CatalogueSource& source);
+
+    /// Whether so many leaves have been named that further ones of messages are not observed: a hostile or
+    /// damaged recording may name others in each message.
+    [[nodiscard]] bool isFull() const { return _root.count() >= mostNodes; }
+    static constexpr std::size_t mostNodes = std::size_t{1} << 17;
 
     /// Whether the messages hold nothing but texts, so that numbers are read from them.
     [[nodiscard]] bool readsNumbersFromTexts() const { return _readsNumbersFromTexts; }

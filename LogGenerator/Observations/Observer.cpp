@@ -3,68 +3,14 @@
 
 #include "LogGenerator/Observations/Observer.h"
 
+#include "LogGenerator/Observations/PhysicalValue.h"
 #include "LogGenerator/Observations/TextNumber.h"
-#include "Platform/DateText.h"
 #include "PropertyLists/Value.h"
 
 #include <algorithm>
 #include <cmath>
 
 namespace velmora {
-
-namespace {
-
-constexpr std::int64_t largestCode = 999; ///< of a mobile country or network code (3GPP TS 23.003 2.2)
-
-bool areDigits(std::string_view text) {
-    return std::all_of(text.begin(), text.end(), [](char c) { return c >= '0' && c <= '9'; });
-}
-
-std::string_view withoutBlanks(std::string_view text) {
-    const std::size_t first = text.find_first_not_of(' ');
-    if (first == std::string_view::npos)
-        return {};
-    return text.substr(first, text.find_last_not_of(' ') + 1 - first);
-}
-
-/// The raw value with the sign that it means.
-std::int64_t signedAsMeant(const Field& field, std::int64_t raw) {
-    const std::uint8_t width = field.place.width;
-    if (field.means.sign == Sign::AsShown || width == 0)
-        return raw;
-    const std::int64_t range = std::int64_t{1} << width;
-    const std::int64_t unsignedRaw = raw & (range - 1);
-    return field.means.sign == Sign::Signed && unsignedRaw >= range / 2 ? unsignedRaw - range : unsignedRaw;
-}
-
-/// The number that the field's format shows, but with the sign that it means.
-double shownNumber(const Field& field, std::int64_t raw) {
-    const TextFormat& format = field.format;
-    const std::int64_t meant = signedAsMeant(field, raw);
-    switch (format.kind) {
-    case TextFormat::Kind::Integer: {
-        const std::int64_t shown =
-            meant * static_cast<std::int64_t>(format.scale) + static_cast<std::int64_t>(format.offset);
-        if (field.means.sign != Sign::AsShown)
-            return static_cast<double>(shown);
-        // An integer is shown in 32 bits, whatever the record holds.
-        return format.format.conversion == 'u' ? static_cast<double>(static_cast<std::uint32_t>(shown))
-                                               : static_cast<double>(static_cast<std::int32_t>(shown));
-    }
-    case TextFormat::Kind::Real: return static_cast<double>(meant) * format.scale + format.offset;
-    case TextFormat::Kind::Hexadecimal: return static_cast<double>(static_cast<std::uint32_t>(meant));
-    default: return static_cast<double>(meant);
-    }
-}
-
-/// The unit that the leaf's texts show.
-Unit textUnit(const CatalogueField& leaf) {
-    if (leaf.sources.empty())
-        return leaf.unit;
-    return unitOfSuffix(leaf.sources.front().field->format.format.suffix).value_or(ShownUnit()).unit;
-}
-
-} // namespace
 
 void Observer::beginMessage() {
     ++_messages;
@@ -130,12 +76,7 @@ void Observer::number(const Field& field, std::int64_t raw) {
         if (entry.kind == ObservedKind::Number) {
             observation.number = shownNumber(field, raw) * entry.scale + entry.offset;
         } else if (entry.kind == ObservedKind::Text) {
-            std::string& digits = _texts.add();
-            if (raw >= 0 && raw <= largestCode)
-                digits = std::to_string(raw);
-            if (!digits.empty() && digits.size() < field.means.digits)
-                digits.insert(0, field.means.digits - digits.size(), '0');
-            setCode(field, digits, observation);
+            setCode(field, codeText(field, raw, _texts), observation);
         }
     });
 }
@@ -158,18 +99,12 @@ void Observer::text(const Field& field, std::string_view text) {
         if (entry.kind != ObservedKind::Text)
             return; // a text in place of the value
         if (field.means.digits != 0) {
-            setCode(field, withoutBlanks(kept), observation);
+            setCode(field, kept, observation);
             return;
         }
         observation.kind = ObservedKind::Text;
         observation.words = kept;
     });
-}
-
-void Observer::setCode(const Field& field, std::string_view digits, Observation& observation) const {
-    const bool isCode = digits.size() >= field.means.digits && areDigits(digits);
-    observation.kind = isCode ? ObservedKind::Text : ObservedKind::Absent;
-    observation.words = isCode ? digits : std::string_view();
 }
 
 void Observer::supplied(const Field& field, const Value& value) {
@@ -211,46 +146,15 @@ void Observer::display(Catalogue& catalogue, const Value& value) {
 }
 
 void Observer::leaf(const CatalogueField& leaf, const Value& value) {
-    Observation& observation = add(leaf, leaf.sources.empty() ? nullptr : &leaf.sources.front());
-    if (const std::string* const text = value.asString()) {
-        observation.given = _texts.copy(*text);
-        if (!leaf.isReadFromText) {
-            observation.kind = ObservedKind::Text;
-            observation.words = observation.given;
-        } else if (const std::optional<TextNumber> number = readTextNumber(*text);
-                   number && number->unit == textUnit(leaf)) {
-            observation.kind = ObservedKind::Number;
-            observation.number = number->value;
-        }
-    } else if (const std::int64_t* const integer = value.asInteger()) {
-        observation.kind = ObservedKind::Number;
-        observation.number = static_cast<double>(*integer);
-        observation.given = _texts.add() = std::to_string(*integer);
-    } else if (const double* const number = value.asReal()) {
-        observation.given = _texts.add() = std::to_string(*number);
-        if (!std::isfinite(*number))
-            return; // absent
-        observation.kind = ObservedKind::Number;
-        observation.number = *number;
-    } else if (const bool* const flag = value.asBoolean()) {
-        observation.kind = ObservedKind::Flag;
-        observation.raw = *flag ? 1 : 0;
-        observation.given = *flag ? "true" : "false";
-    } else if (const Date* const date = value.asDate()) {
-        observation.kind = ObservedKind::Text;
-        observation.given = _texts.add() = dateAndTimeText(*date, " ");
-        observation.words = observation.given;
-    } else if (const Data* const data = value.asData()) {
-        observation.kind = ObservedKind::Binary;
-        observation.bytes = data->bytes();
-    }
+    setSupplied(value, _texts, add(leaf, leaf.sources.empty() ? nullptr : &leaf.sources.front()));
 }
 
 void Observer::tree(Catalogue& catalogue, Catalogue::Node& node, std::string_view section,
                     const Value& value) {
     if (const Dictionary* const dictionary = value.asDictionary()) {
         for (const auto& [key, child] : *dictionary)
-            tree(catalogue, node.child(key), section, child);
+            if (Catalogue::Node* const place = catalogue.isFull() ? node.find(key) : &node.child(key))
+                tree(catalogue, *place, section, child);
     } else if (const Array* const array = value.asArray()) {
         _lists.push_back({&node, static_cast<std::uint32_t>(array->size())});
         const RowNumbers* const outer = _row;

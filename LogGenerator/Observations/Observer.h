@@ -67,7 +67,6 @@ private:
     template <class Observe>
     void forEachLeaf(const Field& field, Observe observe);
     Observation& add(const CatalogueField& leaf, const CatalogueSource* source);
-    void setCode(const Field& field, std::string_view digits, Observation& observation) const;
     /// Sets what identifies the row of the observations from `first` on, by the leaves of these names.
     void setKey(std::size_t first, std::span<const std::string_view> names);
     /// The leaves at the node and below it that none of the observations from that one on is of show nothing

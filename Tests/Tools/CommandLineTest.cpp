@@ -1,9 +1,7 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Tools/CommandLine.h"
-
-#include "Tests/Tools/ToolFixture.h"
+#include "Tests/Tools/ParsedCommandLine.h"
 
 #include <gmock/gmock.h>
 
@@ -14,14 +12,6 @@ namespace {
 
 using testing::ElementsAre;
 using testing::HasSubstr;
-
-const std::string technologies =
-    "IFX, GSM (Ostrel_GSM), CDMA (Ostrel_CDMA), LTE (Ostrel_LTE), UTRAN (Ostrel_UTRAN2)";
-
-CommandLine parse(std::vector<const char*> arguments) {
-    arguments.insert(arguments.begin(), "velmora-log");
-    return parseCommandLine(static_cast<int>(arguments.size()), arguments.data());
-}
 
 TEST(CommandLineTest, DecodeTakesFilesFormatAndTechnology) {
     const CommandLine line = parse({"decode", "a", "-", "--format", "json", "--technology", "IFX", "b"});
@@ -221,129 +211,6 @@ TEST(CommandLineTest, FieldsTakesATechnologyARoleAndAFormat) {
     EXPECT_EQ(plain->technology, "");
     EXPECT_TRUE(plain->roles.isEverything());
     EXPECT_EQ(plain->format, FieldsOptions::Format::Text);
-}
-
-TEST(CommandLineTest, UsageErrorsGiveTheFoundAndTheExpectedValue) {
-    struct Case {
-        std::vector<const char*> arguments;
-        std::string message;
-    };
-    const Case cases[] = {
-        {{}, "no command, wanted decode, watch, record, convert, info or fields"},
-        {{"bogus"}, "got bogus, wanted one of the commands decode, watch, record, convert, info and fields"},
-        {{"decode"}, "FILE is required"},
-        {{"decode", "--format", "xml", "a"}, "--format: got xml, wanted text or json or jsonl or csv"},
-        {{"decode", "--every", "day", "a"}, "--every: got day, wanted refresh or message"},
-        {{"decode", "--select", "GSM", "a"}, "--select: got GSM, wanted a path that begins with a slash"},
-        {{"decode", "--jobs", "0", "a"}, "--jobs: got 0, wanted a number above 0"},
-        {{"decode", "--from", "noon", "a"},
-         "--from: got noon, wanted a time such as 2026-11-16T05:00:00Z, seconds since 1970, or +SECONDS "
-         "after the first message"},
-        {{"decode", "--to", "-1", "a"},
-         "--to: got -1, wanted a time such as 2026-11-16T05:00:00Z, seconds since 1970, or +SECONDS after "
-         "the first message"},
-        {{"decode", "--warm", "a"}, "--warm: got no --from, wanted the time from which on to write"},
-        {{"decode", "--code", "512C", "a"}, "--code: got 512C, wanted a log code such as 0x512C or 0xFF0000"},
-        {{"convert", "--from", "noon", "a", "b.dlf"},
-         "--from: got noon, wanted a time such as 2026-11-16T05:00:00Z, seconds since 1970, or +SECONDS "
-         "after the first message"},
-        {{"decode", "--format", "csv", "a"}, "--format csv: got no --select, wanted one for each column"},
-        {{"decode", "--every", "message", "a"},
-         "--every message: got another format, wanted --format jsonl or csv"},
-        {{"decode", "--every", "message", "--format", "json", "a"},
-         "--every message: got another format, wanted --format jsonl or csv"},
-        {{"decode", "--select", "=/GSM", "a"}, "--select: got =/GSM, wanted a path that begins with a slash"},
-        {{"decode", "--samples", "a"}, "--samples: got another format, wanted --format jsonl or csv"},
-        {{"decode", "--samples", "--format", "csv", "--every", "message", "a"},
-         "--samples: got --every message too, wanted one of the two"},
-        {{"decode", "--wide", "--format", "csv", "--select", "/A", "a"}, "--wide requires --samples"},
-        {{"decode", "--samples", "--wide", "--format", "csv", "a"},
-         "--wide: got no --select, wanted one for each column"},
-        {{"decode", "--samples", "--wide", "--format", "jsonl", "--select", "/A", "a"},
-         "--wide: got another format, wanted --format csv"},
-        {{"decode", "--max-age", "0", "--format", "jsonl", "a"},
-         "--max-age: got 0, wanted seconds from 0.001 to 2000000"},
-        {{"decode", "--max-age", "5", "a"},
-         "--max-age: got another output, wanted --every refresh with --format jsonl or csv"},
-        {{"decode", "--max-age", "5", "--format", "jsonl", "--every", "message", "a"},
-         "--max-age: got another output, wanted --every refresh with --format jsonl or csv"},
-        {{"decode", "--max-age", "5", "--format", "jsonl", "--samples", "a"},
-         "--max-age: got another output, wanted --every refresh with --format jsonl or csv"},
-        {{"decode", "--bogus", "a"}, "The following argument was not expected: --bogus"},
-        {{"record", "a", "--count", "0"}, "--count: got 0, wanted a number above 0"},
-        {{"record", "a", "--duration", "0"}, "--duration: got 0, wanted seconds from 0.001 to 2000000"},
-        {{"record", "a", "--duration", "1e99"}, "--duration: got 1e99, wanted seconds from 0.001 to 2000000"},
-        {{"record", "a", "--timeout", "0"}, "--timeout: got 0, wanted seconds from 0.001 to 2000000"},
-        {{"watch", "--once", "--timeout", "x"}, "--timeout: got x, wanted seconds from 0.001 to 2000000"},
-        {{"watch", "--timeout", "1"}, "--timeout requires --once"},
-        {{"convert", "a"}, "OUT is required"},
-        {{"convert", "a", "-"}, "OUT: got -, wanted a name that ends in .pcapng, .velmora or .dlf"},
-        {{"decode", "--technology", "5G", "a"}, "--technology: got 5G, wanted one of " + technologies},
-        {{"convert", "--technology", "Ostrel_XYZ", "a", "b.dlf"},
-         "--technology: got Ostrel_XYZ, wanted one of " + technologies},
-        {{"info", "--technology", "", "a"}, "--technology: got , wanted one of " + technologies},
-        {{"info"}, "FILE is required"},
-        {{"info", "--format", "jsonl", "a"}, "--format: got jsonl, wanted text or json"},
-        {{"fields", "a"}, "The following argument was not expected: a"},
-        {{"fields", "--format", "jsonl"}, "--format: got jsonl, wanted text or json or csv"},
-        {{"fields", "--technology", "5G"}, "--technology: got 5G, wanted one of " + technologies},
-        {{"fields", "--role", "level"},
-         "--role: got level, wanted one of serving.mcc, serving.mnc, serving.area, serving.cell, "
-         "serving.channel, serving.physical-cell, serving.level, serving.quality, neighbour.channel, "
-         "neighbour.physical-cell, neighbour.level, neighbour.quality, registration.state, radio.state, "
-         "block-error-rate, data-rate, or the part before a dot"},
-        {{"watch", "--log-level", "8"}, "--log-level: got 8, wanted a number from 0 to 7"},
-        {{"--log", "file", "watch"}, "--log: got file, wanted syslog or stderr"},
-    };
-    for (const Case& row : cases) {
-        const CommandLine line = parse(row.arguments);
-        const auto* words = std::get_if<CommandLine::Notice>(&line.command);
-        ASSERT_NE(words, nullptr) << row.message;
-        EXPECT_EQ(words->status, 2);
-        EXPECT_EQ(words->text,
-                  std::string("velmora-log: ") + row.message + "\nvelmora-log --help tells more\n");
-    }
-}
-
-class CommandLineProgramTest : public ToolTest {};
-
-TEST_F(CommandLineProgramTest, EveryHelpTextShowsAnExampleOnStandardOutput) {
-    const std::vector<std::pair<std::vector<std::string>, std::string>> cases = {
-        {{"--help"}, "\n  velmora-log watch\n"},
-        {{"decode", "--help"}, "\n  velmora-log decode drive.pcapng\n"},
-        {{"watch", "--help"}, "\n  velmora-log watch\n"},
-        {{"record", "--help"}, "\n  velmora-log record drive.pcapng\n"},
-        {{"convert", "--help"}, "\n  velmora-log record - | velmora-log convert - drive.dlf\n"},
-        {{"info", "--help"}, "\n  velmora-log info drive.pcapng\n"},
-        {{"fields", "--help"}, "\n  velmora-log fields --role serving\n"},
-    };
-    for (const auto& [arguments, example] : cases) {
-        ToolProcess process(tool(arguments));
-        EXPECT_EQ(process.exitStatus(), 0);
-        EXPECT_THAT(process.output(), HasSubstr(example));
-        EXPECT_EQ(process.errors(), "");
-    }
-}
-
-TEST_F(CommandLineProgramTest, VersionIsALineOfStandardOutput) {
-    ToolProcess process(tool({"--version"}));
-    EXPECT_EQ(process.exitStatus(), 0);
-    EXPECT_THAT(process.output(), testing::MatchesRegex("velmora-log [0-9]+\\.[0-9]+\\.[0-9]+\n"));
-}
-
-TEST_F(CommandLineProgramTest, UsageErrorEndsWithTwo) {
-    ToolProcess process(tool({"decode"}));
-    EXPECT_EQ(process.exitStatus(), 2);
-    EXPECT_EQ(process.output(), "");
-    EXPECT_EQ(process.errors(), "velmora-log: FILE is required\nvelmora-log --help tells more\n");
-}
-
-TEST_F(CommandLineProgramTest, HelpToAFullDiskIsReported) {
-    ToolProcess::Setup setup = tool({"--help"});
-    setup.outputFile = "/dev/full";
-    ToolProcess process(setup);
-    EXPECT_EQ(process.exitStatus(), 1);
-    EXPECT_EQ(process.errors(), "velmora-log: cannot write standard output: No space left on device\n");
 }
 
 } // namespace

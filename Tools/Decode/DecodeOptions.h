@@ -3,7 +3,7 @@
 
 #pragma once
 
-#include "Tools/Decode/NodeSelection.h"
+#include "Tools/Decode/Paths/NodeSelection.h"
 #include "Tools/Messages/MessageSelection.h"
 
 #include <chrono>

@@ -167,6 +167,19 @@ TEST_F(TreeTest, ANumberInAnotherUnitIsAbsent) {
     EXPECT_EQ(textOf(only()), "none");
 }
 
+// A recording that names other labels in each message must not fill the memory.
+TEST_F(TreeTest, LeavesAreNamedUpToALimit) {
+    for (std::size_t i = 0; i < Catalogue::mostNodes + 10; ++i) {
+        observer.beginMessage();
+        show(dictionary({{"Label " + std::to_string(i), "1"}}));
+    }
+    EXPECT_TRUE(observations().empty());
+    EXPECT_LE(catalogue.fields().size(), Catalogue::mostNodes);
+    observer.beginMessage();
+    show(dictionary({{"Label 7", "1"}}));
+    EXPECT_EQ(only().leaf->path, "/Label 7");
+}
+
 // Their number must not square the time.
 TEST_F(TreeTest, ADisplayMayHaveVeryManyLabels) {
     const DictionaryRef many = makeDictionary();

@@ -4,7 +4,7 @@
 #pragma once
 
 #include "LogGenerator/Observations/Observation.h"
-#include "Tools/Decode/NodeSelection.h"
+#include "Tools/Decode/Paths/NodeSelection.h"
 #include "Tools/Text/TextBuffer.h"
 
 #include <cstddef>

@@ -4,7 +4,7 @@
 #pragma once
 
 #include "LogGenerator/Observations/Catalogue.h"
-#include "Tools/Decode/NodeSelection.h"
+#include "Tools/Decode/Paths/NodeSelection.h"
 
 #include <string>
 #include <vector>

@@ -4,7 +4,7 @@
 #pragma once
 
 #include "LogGenerator/Observations/PathPattern.h"
-#include "Tools/Decode/NodeSelection.h"
+#include "Tools/Decode/Paths/NodeSelection.h"
 
 #include <cstddef>
 #include <span>

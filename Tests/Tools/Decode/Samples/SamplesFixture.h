@@ -41,10 +41,11 @@ protected:
     [[nodiscard]] static std::vector<std::vector<std::string>> table(const std::string& text) {
         std::vector<std::vector<std::string>> rows;
         for (const std::string& line : lines(text)) {
-            std::vector<std::string>& row = rows.emplace_back();
+            std::vector<std::string> row;
             std::istringstream stream(line + ",");
             for (std::string cell; std::getline(stream, cell, ',');)
                 row.push_back(cell);
+            rows.push_back(std::move(row));
         }
         return rows;
     }

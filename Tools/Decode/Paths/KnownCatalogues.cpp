@@ -1,10 +1,10 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Tools/Decode/KnownCatalogues.h"
+#include "Tools/Decode/Paths/KnownCatalogues.h"
 
 #include "Tools/Decode/DecodeOptions.h"
-#include "Tools/Decode/FileTechnologies.h"
+#include "Tools/Decode/Paths/FileTechnologies.h"
 #include "Tools/Log/QuietConsole.h"
 #include "Tools/LogOverride.h"
 #include "Tools/Technologies.h"

@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Tools/Decode/PathCheck.h"
+#include "Tools/Decode/Paths/PathCheck.h"
 
 #include "LogGenerator/Observations/PathPattern.h"
 

@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Tools/Decode/NodeSelection.h"
+#include "Tools/Decode/Paths/NodeSelection.h"
 
 #include "LogGenerator/Observations/PathPattern.h"
 #include "Model/NodePath.h"
