@@ -169,9 +169,13 @@ TEST_F(TreeTest, ANumberInAnotherUnitIsAbsent) {
 
 // A recording that names other labels in each message must not fill the memory.
 TEST_F(TreeTest, LeavesAreNamedUpToALimit) {
-    for (std::size_t i = 0; i < Catalogue::mostNodes + 10; ++i) {
+    constexpr std::size_t labelsOfMessage = 10'000;
+    for (std::size_t i = 0; i < Catalogue::mostNodes + labelsOfMessage;) {
+        const DictionaryRef labels = makeDictionary();
+        for (std::size_t end = i + labelsOfMessage; i < end; ++i)
+            labels->set("Label " + std::to_string(i), "1");
         observer.beginMessage();
-        show(dictionary({{"Label " + std::to_string(i), "1"}}));
+        show(labels);
     }
     EXPECT_TRUE(observations().empty());
     EXPECT_LE(catalogue.fields().size(), Catalogue::mostNodes);
