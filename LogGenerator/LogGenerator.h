@@ -58,8 +58,8 @@ public:
     [[nodiscard]] virtual std::string_view technology() const { return {}; }
     /// Every leaf that its displays can show. Made on the first call.
     [[nodiscard]] Catalogue& catalogue();
-    /// Who gets the observations of every message from now on; null for nobody, when nothing is computed for
-    /// them. The sink must outlive the decoder or the next call.
+    /// Sets the sink, which receives the observations of each message from now on and must outlive the
+    /// decoder or the next call. Null for none: then no observations are computed.
     void setObservationSink(ObservationSink* sink);
     /// When the latest record of a section arrived, since there is a sink: how old what it shows is. Absent
     /// where none has, and for what is no section.

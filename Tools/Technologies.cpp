@@ -17,7 +17,7 @@ struct Form {
     std::string_view technology;
 };
 
-/// As one says for each technology.
+/// The short form of each technology, as engineers write it.
 constexpr std::array forms = {
     Form{"IFX", kVoxLogChannelTechnology_IFX},
     Form{"GSM", kVoxLogChannelTechnology_Ostrel_GSM},

@@ -13,18 +13,18 @@
 
 namespace velmora {
 
-/// While it lives, the lines about the connection to the telephony service, which repeat with each attempt to
-/// connect, are counted, and a change of what is wrong with it is reported as prose. Other lines are written.
+/// Counts the lines about the connection to the telephony service, which repeat with each attempt to connect,
+/// and reports each change of the connection's error. Writes all other lines.
 class ServiceLog final : public LogOverride {
 public:
-    /// `lines` must outlive it. `changed` gets what is wrong now, once for each change: "no telephony service
+    /// `lines` must outlive it. `changed` gets the current error, once for each change: "no telephony service
     /// answers".
     explicit ServiceLog(DecoderLines& lines, std::function<void(const std::string& problem)> changed = {})
         : _lines(lines), _changed(std::move(changed)) {}
 
     void write(int priority, std::string_view text) override;
 
-    /// What is wrong with the connection, as far as the log has said; empty while nothing is.
+    /// The connection's current error, as far as the log shows it; empty for none.
     [[nodiscard]] const std::string& problem() const { return _problem; }
     /// The cause of this attempt's failure, which has been found otherwise than by the log.
     void setCause(const std::string& problem) {

@@ -96,7 +96,7 @@ TEST_F(SinkTest, AfterAnUnreadableSIMFileItGoesOn) {
 TEST_F(SinkTest, TheAgeOfASectionIsThatOfItsLatestRecord) {
     using namespace std::chrono_literals;
     update(record(0xD0E0, "01 04"));
-    EXPECT_EQ(tested.decoder().latestRecord("RRC Info"), std::nullopt); // nobody observes it
+    EXPECT_EQ(tested.decoder().latestRecord("RRC Info"), std::nullopt); // there is no sink
     tested.decoder().setObservationSink(&sink);
     tested.clock().advance(1s);
     update(record(0xD0E0, "01 03"));

@@ -22,7 +22,7 @@ using testing::StartsWith;
 
 class InfoFilesTest : public SeveralTechnologiesTest {
 protected:
-    /// How many objects there are; what is wrong with them where they do not keep to the schema.
+    /// The number of objects, or the validation error of the first that does not conform to the schema.
     static std::string check(const std::string& json) {
         ToolProcess::Setup setup;
         setup.arguments = {VELMORA_SOURCE_DIR "/Tests/Tools/Decode/check-json.py",

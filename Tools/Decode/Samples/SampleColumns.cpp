@@ -16,6 +16,13 @@ std::string titleOf(const std::string& name, const CatalogueField& leaf) {
     return unit.empty() ? name : name + " (" + std::string(unit) + ")";
 }
 
+/// Whether another of the leaves has the same name.
+bool hasNamesake(const std::vector<const CatalogueField*>& leaves, const CatalogueField& leaf) {
+    return std::any_of(leaves.begin(), leaves.end(), [&leaf](const CatalogueField* other) {
+        return other != &leaf && other->node->name() == leaf.node->name();
+    });
+}
+
 } // namespace
 
 void SampleColumns::add(const NodeSelection& selection, const Catalogue& catalogue) {
@@ -29,11 +36,11 @@ void SampleColumns::add(const NodeSelection& selection, const Catalogue& catalog
         for (const CatalogueField* const leaf : leaves) {
             if (contains(path, leaf->path))
                 continue;
-            // A name for several leaves is told apart by theirs.
+            // Where one name selects several leaves, the leaf's own name makes the title unique, or its path.
             const std::string& name = selection.names()[path];
             std::string title = leaves.size() == 1 ? name : leaf->path;
             if (leaves.size() > 1 && isNamed)
-                title = name + "/" + leaf->node->name();
+                title = name + (hasNamesake(leaves, *leaf) ? leaf->path : "/" + leaf->node->name());
             _columns.push_back({titleOf(title, *leaf), leaf->path, path});
         }
         // A tree that names its own leaves may have it.

@@ -58,6 +58,12 @@ TEST_F(WideSamplesTest, ColumnsAreLeavesWithTheirUnits) {
         "time,modem_time,code,record,m/Version,m/E-ARFC");
 }
 
+TEST_F(WideSamplesTest, LeavesOfTheSameNameHaveTheirPathsInTheTitle) {
+    EXPECT_EQ(lines(wideOfRecording({"--select", "state=/Registration/*/MM State", recording("gsm")}))[0],
+              "time,modem_time,code,record,state/Registration/Process CS/MM State,"
+              "state/Registration/Process PS/MM State,state/Registration/Process CO/MM State");
+}
+
 TEST_F(WideSamplesTest, EachMessageThatReportedAValueHasARow) {
     writeDrive("a.pcapng");
     const std::vector<std::string> select = {"--select", "/GSM RR Info/RR State",
