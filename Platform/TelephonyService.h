@@ -49,6 +49,8 @@ inline constexpr std::string_view kVoxLogChannelTechnology_Ostrel_CDMA =
 inline constexpr std::string_view kVoxLogChannelTechnology_Ostrel_LTE = "kVoxLogChannelTechnology_Ostrel_LTE";
 inline constexpr std::string_view kVoxLogChannelTechnology_Ostrel_UTRAN2 =
     "kVoxLogChannelTechnology_Ostrel_UTRAN2";
+/// A live modem, whatever its radio technology: the extra stream alone.
+inline constexpr std::string_view kVoxLogChannelTechnology_Modem = "kVoxLogChannelTechnology_Modem";
 
 /// All of them.
 inline constexpr std::array voxTechnologies = {
