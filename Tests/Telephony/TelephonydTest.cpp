@@ -71,6 +71,24 @@ TEST_F(TelephonydTest, streamsTheScenarioAndStopsCleanly) {
     }
 }
 
+TEST_F(TelephonydTest, servesWithoutStandardDescriptors) {
+    TestProcess service("/bin/sh",
+                        {"-c", "exec \"$0\" --source scenario:ifx --log-level 7 <&- >&- 2>&-",
+                         VELMORA_BUILD_DIR "/velmora-telephonyd"},
+                        directory.path());
+    for (const char* name : {"com.velmora.test.first", "com.velmora.test.second"}) {
+        // Each is several log lines, which must not go into another file of the service.
+        TestClient client(directory.path(), name);
+        ASSERT_TRUE(client.connect());
+        EXPECT_EQ(client.technology(), "kVoxLogChannelTechnology_IFX");
+        ASSERT_TRUE(client.stream());
+        ASSERT_TRUE(eventually([&] { return !client.messages.empty(); }));
+        client.close();
+    }
+    service.signal(SIGTERM);
+    EXPECT_EQ(service.exitStatus(), 0);
+}
+
 TEST_F(TelephonydTest, notifiesTheServiceManagerOfReadinessAndStop) {
     NotifySocket manager((directory / "notify").string());
     ::setenv("NOTIFY_SOCKET", manager.address().c_str(), 1);
