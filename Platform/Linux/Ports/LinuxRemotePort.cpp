@@ -5,6 +5,7 @@
 
 #include "Platform/Linux/Errno.h"
 #include "Platform/Linux/Ports/PeerUser.h"
+#include "Platform/Linux/Ports/SocketWait.h"
 #include "Platform/SystemLog.h"
 
 #include <fcntl.h>
@@ -28,27 +29,6 @@ using SteadyClock = std::chrono::steady_clock;
 constexpr std::size_t batchMessages = 64;
 constexpr std::size_t batchBytes = std::size_t{128} << 10;
 constexpr auto restartPollInterval = std::chrono::milliseconds(10);
-
-SteadyClock::time_point deadlineAfter(std::chrono::nanoseconds time) {
-    constexpr std::chrono::nanoseconds longest = std::chrono::hours(24 * 365); // the sum must not overflow
-    return SteadyClock::now() + std::clamp(time, std::chrono::nanoseconds::zero(), longest);
-}
-
-/// Blocks until the socket is ready for `events` or has ended; false when the deadline comes first.
-bool waitFor(int descriptor, short events, SteadyClock::time_point deadline) {
-    for (;;) {
-        const auto left = std::max(deadline - SteadyClock::now(), SteadyClock::duration::zero());
-        const auto seconds = std::chrono::floor<std::chrono::seconds>(left);
-        const timespec time = {static_cast<time_t>(seconds.count()),
-                               static_cast<long>((left - seconds).count())};
-        pollfd poll = {descriptor, events, 0};
-        const int ready = ::ppoll(&poll, 1, &time, nullptr);
-        if (ready >= 0)
-            return ready > 0;
-        if (errno != EINTR)
-            return false;
-    }
-}
 
 /// 0, or the errno value.
 int connectTo(const PortAddress& address, int descriptor) {
