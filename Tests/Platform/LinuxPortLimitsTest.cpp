@@ -99,7 +99,7 @@ TEST_F(LinuxPortLimits, FewIdleConnectionsStay) {
 }
 
 TEST_F(LinuxPortLimits, UnfinishedFramesOfAllPortsShareTheirMemory) {
-    _options.frameMemory = std::size_t{1} << 20;
+    _options.frameMemory = 1'500'000;
     LinuxMessagePorts ports(_options);
     const auto noAnswer = [](LocalPort&, std::int32_t, const Data&) { return std::nullopt; };
     const auto first = ports.createLocal("in", noAnswer).port;
@@ -108,6 +108,7 @@ TEST_F(LinuxPortLimits, UnfinishedFramesOfAllPortsShareTheirMemory) {
     second->attachToMainQueue();
     const auto longest = rawClient("in");
     const auto shorter = rawClient("other");
+    const auto last = rawClient("other");
     const auto sendSlowly = [](const FileDescriptor& socket, std::size_t bytes) {
         sendAll(socket, unfinished);
         const Data piece(std::vector<std::uint8_t>(50'000));
@@ -116,14 +117,18 @@ TEST_F(LinuxPortLimits, UnfinishedFramesOfAllPortsShareTheirMemory) {
             turnLoop();
         }
     };
-    sendSlowly(longest, 600'000);
-    sendSlowly(shorter, 500'000);
+    sendSlowly(longest, 450'000);
+    sendSlowly(shorter, 300'000);
+    EXPECT_THAT(_log.lines(), IsEmpty());
+    sendSlowly(last, 300'000);
     EXPECT_TRUE(isClosedByPeer(longest));
     EXPECT_THAT(_log.lines(), ElementsAre(CapturedLog::Line{
                                   3, "Message port in: closed a connection: unfinished frames take "
-                                     "more than 1048576 bytes, and it has the longest"}));
-    pollfd poll = {shorter.get(), POLLRDHUP, 0};
-    EXPECT_EQ(::poll(&poll, 1, 0), 0) << "the other goes on";
+                                     "more than 1500000 bytes, and it has the longest"}));
+    for (const auto* other : {&shorter, &last}) {
+        pollfd poll = {other->get(), POLLRDHUP, 0};
+        EXPECT_EQ(::poll(&poll, 1, 0), 0) << "the others go on";
+    }
 }
 
 TEST_F(LinuxPortLimits, RefusalsAreLinesTenTimesASecond) {

@@ -16,7 +16,8 @@ std::size_t FrameMemory::held() const {
 }
 
 bool FrameMemory::makeRoom(const FrameReader& reader, std::size_t size) {
-    while (held() - reader.memory() + size > _limit) {
+    // Until its bytes are moved the reader has its earlier memory too.
+    while (held() + size > _limit) {
         const auto largest = std::max_element(
             _readers.begin(), _readers.end(),
             [](const FrameReader* a, const FrameReader* b) { return a->memory() < b->memory(); });

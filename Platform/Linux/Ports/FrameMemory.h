@@ -25,8 +25,9 @@ public:
     /// Bytes that all readers hold.
     [[nodiscard]] std::size_t held() const;
 
-    /// Makes sure that `reader` can hold `size` bytes within the limit, at the cost of readers that hold more
-    /// than that. False when there is none: then `reader` itself is the one that has to give up.
+    /// Makes sure that `reader` can move to a buffer of `size` bytes within the limit, at the cost of readers
+    /// that hold more than that. False when there is none: then `reader` itself is the one that has to give
+    /// up.
     [[nodiscard]] bool makeRoom(const FrameReader& reader, std::size_t size);
 
 private:
