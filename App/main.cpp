@@ -9,6 +9,7 @@
 #include "Platform/Linux/Files/LinuxFileSystem.h"
 #include "Platform/Linux/ProgramLog.h"
 #include "Platform/Linux/ServiceStarter.h"
+#include "Platform/Linux/StandardDescriptors.h"
 #include "Platform/Linux/Termination.h"
 #include "Platform/SystemLog.h"
 
@@ -97,6 +98,7 @@ int show(const Options& options, char* program) {
 } // namespace
 
 int main(int argc, char** argv) {
+    openClosedStandardDescriptors();
     endOnUncaughtExceptions("velmora");
     returnLargeAllocations();
     Options options;

@@ -26,6 +26,9 @@ inline constexpr std::int32_t TransportError =
 inline constexpr std::int32_t BecameInvalid = -5; ///< the connection ended while the answer was awaited
 } // namespace PortStatus
 
+/// Bytes of a port's name.
+inline constexpr std::size_t maximumPortNameSize = 80;
+
 /// A named port of this process on which messages arrive. Its holders own it; dropping the last reference, or
 /// `invalidate`, closes it and frees its name. Callbacks run on the main queue, and each of them may
 /// invalidate the port or drop the last reference to it. Main thread only.
@@ -36,6 +39,10 @@ public:
     [[nodiscard]] virtual bool isValid() const = 0;
     /// Lets callbacks run. A port that is not attached receives no message; senders wait.
     virtual void attachToMainQueue() = 0;
+    /// For a port whose senders make a request, wait for the answer and leave: when its connections become
+    /// many, those that have sent nothing for a while may be closed. On any other port these are only those
+    /// that have never sent a message, or leave one unfinished.
+    virtual void closeIdleConnections() {}
     /// Called once when the port becomes invalid, whether by `invalidate` or because the platform closed it,
     /// with the port (alive for the length of the call). An empty function removes the callback.
     virtual void setInvalidationCallback(std::function<void(LocalPort&)> callback) = 0;

@@ -9,6 +9,7 @@
 #include "Platform/Linux/QtMainQueue.h"
 #include "Platform/Linux/ServiceManager.h"
 #include "Platform/Linux/SignalWatcher.h"
+#include "Platform/Linux/StandardDescriptors.h"
 #include "Platform/Linux/Termination.h"
 #include "Platform/SystemLog.h"
 #include "Telephony/Service/LogServer.h"
@@ -94,6 +95,7 @@ int serve(const Options& options, const velmora::SourceChoice& choice) {
 } // namespace
 
 int main(int argc, char** argv) {
+    velmora::openClosedStandardDescriptors();
     velmora::endOnUncaughtExceptions(program);
     Options options;
     CLI::App app;

@@ -5,6 +5,7 @@
 
 #include "Platform/Console.h"
 #include "Platform/Linux/Files/FileResources.h"
+#include "Platform/Linux/StandardDescriptors.h"
 #include "Tools/CommandLine.h"
 #include "Tools/Convert/ConvertCommand.h"
 #include "Tools/Decode/DecodeCommand.h"
@@ -22,23 +23,11 @@
 #include <cstdio>
 #include <optional>
 
-#include <fcntl.h>
 #include <unistd.h>
 
 namespace velmora {
 
 namespace {
-
-/// Where a standard stream was closed before the program started, the next file opened would get its number,
-/// and log lines meant for standard error would end up in a recording.
-void keepStandardStreams() {
-    int descriptor = 0;
-    do
-        descriptor = ::open("/dev/null", O_RDONLY); // writing to it stays an error
-    while (descriptor >= 0 && descriptor <= STDERR_FILENO);
-    if (descriptor >= 0)
-        ::close(descriptor);
-}
 
 int say(const CommandLine::Notice& words, Output& output) {
     if (words.status == ExitStatus::Usage) {
@@ -68,7 +57,7 @@ int run(const CommandLine& line, DecoderLines& lines, Output& output) {
 } // namespace
 
 int runVelmoraLog(int count, const char* const* arguments) {
-    keepStandardStreams();
+    openClosedStandardDescriptors();
     // Standard output carries the result alone.
     redirectConsole(stderr);
     std::signal(SIGPIPE, SIG_IGN); // the write that meets a closed pipe reports it

@@ -4,7 +4,6 @@
 #include "Platform/Linux/ProgramLog.h"
 
 #include "Platform/Linux/StderrLog.h"
-#include "Platform/Linux/SyslogLog.h"
 
 #include <utility>
 
@@ -18,9 +17,9 @@ std::optional<LogKind> logKindNamed(std::string_view name) {
     return std::nullopt;
 }
 
-ProgramLog::ProgramLog(LogKind kind, int level, std::string identity) {
+ProgramLog::ProgramLog(LogKind kind, int level, std::string identity, std::string syslogSocket) {
     if (kind == LogKind::Syslog)
-        _log = std::make_unique<SyslogLog>(std::move(identity));
+        _log = std::make_unique<SyslogLog>(std::move(identity), std::move(syslogSocket));
     else
         _log = std::make_unique<StderrLog>();
     setSystemLog(_log.get(), level);

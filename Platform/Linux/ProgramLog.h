@@ -3,6 +3,7 @@
 
 #pragma once
 
+#include "Platform/Linux/SyslogLog.h"
 #include "Platform/SystemLog.h"
 
 #include <memory>
@@ -22,8 +23,10 @@ enum class LogKind { Syslog, Stderr };
 /// `--log` and `--log-level`.
 class ProgramLog {
 public:
-    /// `level` is 0 to 7: lines of a higher priority value are discarded. `identity` is the program's name.
-    ProgramLog(LogKind kind, int level, std::string identity);
+    /// `level` is 0 to 7: lines of a higher priority value are discarded. `identity` is the program's name,
+    /// `syslogSocket` as SyslogLog has it.
+    ProgramLog(LogKind kind, int level, std::string identity,
+               std::string syslogSocket = SyslogLog::standardSocket);
     ~ProgramLog();
     ProgramLog(const ProgramLog&) = delete;
     ProgramLog& operator=(const ProgramLog&) = delete;

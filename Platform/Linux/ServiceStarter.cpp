@@ -16,6 +16,7 @@
 
 #include <csignal>
 #include <filesystem>
+#include <memory>
 #include <string>
 #include <system_error>
 #include <thread>
@@ -38,7 +39,8 @@ std::string serviceProgram() {
 }
 
 bool answers() {
-    const auto port = LinuxRemotePort::connect(std::string(vox::serverPortName), {});
+    const auto port =
+        LinuxRemotePort::connect(std::string(vox::serverPortName), {}, std::make_shared<PortPeers>());
     return port && *port;
 }
 

@@ -3,15 +3,38 @@
 
 #include "Platform/Linux/SyslogLog.h"
 
+#include "Platform/Linux/Files/FileDescriptor.h"
+
+#include <sys/socket.h>
+#include <sys/un.h>
 #include <syslog.h>
 
 #include <algorithm>
+#include <cerrno>
+#include <cinttypes>
 #include <limits>
 #include <utility>
 
 namespace velmora {
 
-SyslogLog::SyslogLog(std::string identity) : _identity(std::move(identity)) {
+namespace {
+
+bool hasListener(const std::string& socket) {
+    sockaddr_un address = {};
+    if (socket.size() >= sizeof address.sun_path)
+        return false;
+    address.sun_family = AF_UNIX;
+    std::copy(socket.begin(), socket.end(), address.sun_path);
+    const FileDescriptor probe(::socket(AF_UNIX, SOCK_DGRAM | SOCK_CLOEXEC, 0));
+    return probe &&
+           (::connect(probe.get(), reinterpret_cast<const sockaddr*>(&address), sizeof address) == 0 ||
+            errno == EPROTOTYPE); // a stream socket, which syslog(3) tries next
+}
+
+} // namespace
+
+SyslogLog::SyslogLog(std::string identity, std::string socket)
+    : _identity(std::move(identity)), _socket(std::move(socket)) {
     ::openlog(_identity.c_str(), LOG_PID, LOG_USER);
 }
 
@@ -20,9 +43,25 @@ SyslogLog::~SyslogLog() {
 }
 
 void SyslogLog::write(int priority, std::string_view text) {
+    if (!isReachable()) {
+        ++_discarded;
+        return;
+    }
+    if (const auto discarded = std::exchange(_discarded, 0); discarded > 0)
+        ::syslog(LOG_ERR, "%" PRIu64 " log lines were discarded while there was no %s", discarded,
+                 _socket.c_str());
     constexpr std::size_t longest = std::numeric_limits<int>::max();
     ::syslog(priority & (LOG_PRIMASK | LOG_FACMASK), "%.*s", static_cast<int>(std::min(text.size(), longest)),
              text.data());
+}
+
+bool SyslogLog::isReachable() {
+    const auto now = std::chrono::steady_clock::now();
+    if (!_tried || now - *_tried >= retryInterval) {
+        _tried = now;
+        _reachable = hasListener(_socket);
+    }
+    return _reachable;
 }
 
 } // namespace velmora

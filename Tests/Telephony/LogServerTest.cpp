@@ -12,6 +12,7 @@ namespace {
 
 using ::testing::ElementsAre;
 using ::testing::IsEmpty;
+using namespace std::chrono_literals;
 
 TEST_F(LogServerTest, makesAChannel) {
     listen();
@@ -56,6 +57,47 @@ TEST_F(LogServerTest, refusesMalformedRequests) {
     EXPECT_EQ(server.channelCount(), 0U);
 }
 
+TEST_F(LogServerTest, refusesNamesOfItsOwn) {
+    listen();
+    const std::string channel = createChannel("app");
+    for (const std::string& own : {serverName, channel, serverName + ".channel.7", serverName + ".x"}) {
+        log.clear();
+        EXPECT_EQ(request(serverName, plist({{"CreateLogChannel", own}})), dictionary({{"Error", 5}}));
+        EXPECT_THAT(errors(),
+                    ElementsAre(own + " requests a log channel, but that name is the service's own"));
+        EXPECT_EQ(ports.connectionCount(own), 0U) << "it would be its own client";
+    }
+    EXPECT_EQ(server.channelCount(), 1U);
+    EXPECT_EQ(createChannel(serverName + "s"), serverName + ".channel.2") << "only begins alike";
+}
+
+TEST_F(LogServerTest, namesThatNoPortCanHaveAreNotRepeated) {
+    listen();
+    EXPECT_EQ(request(serverName, plist({{"CreateLogChannel", std::string(81, 'x')}})),
+              dictionary({{"Error", 2}}));
+    EXPECT_EQ(request(serverName, plist({{"CreateLogChannel", "a\tb"}})), dictionary({{"Error", 2}}));
+    EXPECT_EQ(request(serverName, plist({{"CreateLogChannel", "a\x7F"}})), dictionary({{"Error", 2}}));
+    EXPECT_THAT(errors(), ElementsAre("a request names a port with 81 bytes, wanted at most 80",
+                                      "a request names a port with control characters, wanted none",
+                                      "a request names a port with control characters, wanted none"));
+    EXPECT_EQ(createChannel(std::string(80, 'x')), serverName + ".channel.1");
+}
+
+TEST_F(LogServerTest, linesAboutClientsAreLimited) {
+    listen();
+    const std::string channel = createChannel("app");
+    for (int i = 0; i < 1000; ++i) {
+        EXPECT_TRUE(ports.deliver(channel, 0, plist({})));
+        EXPECT_EQ(request(serverName, plist({})), dictionary({{"Error", 2}}));
+    }
+    EXPECT_EQ(errors().size(), 20U);
+    log.clear();
+    queue.advance(1s);
+    EXPECT_THAT(errors(), ::testing::UnorderedElementsAre(
+                              "invalid commands: 990 more within a second",
+                              "refused requests for log channels: 990 more within a second"));
+}
+
 TEST_F(LogServerTest, refusesWhenNoChannelPortCanBeMade) {
     listen();
     ports.serve("app", [](std::int32_t, const Data&, bool) { return RemotePort::Answer{}; });
@@ -74,6 +116,32 @@ TEST_F(LogServerTest, boundsTheChannels) {
     EXPECT_THAT(errors(), ElementsAre("late requests a log channel, but 64 are open already"));
     ports.sever("app0");
     EXPECT_EQ(createChannel("late"), "com.velmora.vox.server.channel.65");
+}
+
+TEST_F(LogServerTest, channelsThatAskForNothingMakeRoomWhereManyAreOpen) {
+    listen();
+    stream(createChannel("streaming"));
+    for (std::size_t i = 1; i < LogServer::maximumChannels; ++i)
+        createChannel("idle" + std::to_string(i));
+    ports.serve("late", [](std::int32_t, const Data&, bool) { return RemotePort::Answer{}; });
+    queue.advance(9s);
+    EXPECT_EQ(request(serverName, plist({{"CreateLogChannel", "late"}})), dictionary({{"Error", 3}}));
+    queue.advance(2s);
+    EXPECT_TRUE(log.contains(LogPriority::Notice,
+                             serverName + ".channel.2: closed, idle1 has asked for nothing within 10 s"));
+    EXPECT_EQ(ports.connectionCount("streaming"), 1U) << "it is in use";
+    stream(createChannel("late"));
+    EXPECT_EQ(ports.connectionCount("late"), 1U);
+    queue.advance(60s);
+    EXPECT_EQ(ports.connectionCount("late"), 1U);
+}
+
+TEST_F(LogServerTest, fewChannelsMayBeIdle) {
+    listen();
+    for (std::size_t i = 1; i < LogServer::manyChannels; ++i)
+        createChannel("idle" + std::to_string(i));
+    queue.advance(60s);
+    EXPECT_EQ(server.channelCount(), LogServer::manyChannels - 1);
 }
 
 TEST_F(LogServerTest, otherMessageIdsAreIgnored) {
@@ -188,6 +256,8 @@ TEST_F(LogServerTest, rubbishCommandsGiveALineEachAndChangeNothing) {
     for (const Case& each : {
              Case{plist({}), ": a command has neither GetTechnology nor SetState"},
              Case{plist({{"SetState", "Sleeping"}}), ": SetState is \"Sleeping\", wanted \"Streaming\""},
+             Case{plist({{"SetState", std::string(1'000'000, 'x')}}),
+                  ": SetState is a text of 1000000 bytes, wanted \"Streaming\""},
              Case{plist({{"SetState", 1}}), ": SetState is of kind integer, wanted \"Streaming\""},
              Case{plist({{"SetState", "Streaming"}, {"SetOstrelLogCodes", "x"}}),
                   ": SetOstrelLogCodes is of kind string, wanted an array"},

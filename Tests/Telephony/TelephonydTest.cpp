@@ -48,7 +48,7 @@ protected:
 };
 
 TEST_F(TelephonydTest, streamsTheScenarioAndStopsCleanly) {
-    for (const int signalNumber : {SIGTERM, SIGINT}) {
+    for (const int signalNumber : {SIGTERM, SIGINT, SIGHUP}) {
         const auto service = start({"--source", "scenario:gsm,seed=3,speed=100", "--log-level", "5"});
         TestClient client(directory.path(), "com.velmora.test.client");
         ASSERT_TRUE(client.connect()) << service->standardError();
@@ -69,6 +69,24 @@ TEST_F(TelephonydTest, streamsTheScenarioAndStopsCleanly) {
                     HasSubstr("<5>stopping on signal " + std::to_string(signalNumber) + "\n"));
         client.close();
     }
+}
+
+TEST_F(TelephonydTest, servesWithoutStandardDescriptors) {
+    TestProcess service("/bin/sh",
+                        {"-c", "exec \"$0\" --source scenario:ifx --log-level 7 <&- >&- 2>&-",
+                         VELMORA_BUILD_DIR "/velmora-telephonyd"},
+                        directory.path());
+    for (const char* name : {"com.velmora.test.first", "com.velmora.test.second"}) {
+        // Each is several log lines, which must not go into another file of the service.
+        TestClient client(directory.path(), name);
+        ASSERT_TRUE(client.connect());
+        EXPECT_EQ(client.technology(), "kVoxLogChannelTechnology_IFX");
+        ASSERT_TRUE(client.stream());
+        ASSERT_TRUE(eventually([&] { return !client.messages.empty(); }));
+        client.close();
+    }
+    service.signal(SIGTERM);
+    EXPECT_EQ(service.exitStatus(), 0);
 }
 
 TEST_F(TelephonydTest, notifiesTheServiceManagerOfReadinessAndStop) {

@@ -20,6 +20,7 @@ namespace velmora {
 namespace {
 
 constexpr int waitingConnections = 64;
+constexpr int idleChecks = 10; // within the time-out
 constexpr int acceptedPerTurn = 16;
 constexpr std::size_t messagesPerTurn = 256;
 constexpr std::size_t bytesPerTurn = std::size_t{1} << 20;
@@ -46,7 +47,8 @@ Result<FileDescriptor> listenOn(const PortDirectory& directory, const std::strin
 
 Result<std::shared_ptr<LinuxLocalPort>> LinuxLocalPort::create(const std::string& name,
                                                                MessagePorts::MessageCallback callback,
-                                                               const PortOptions& options) {
+                                                               const PortOptions& options,
+                                                               std::shared_ptr<PortPeers> peers) {
     if (auto checked = PortDirectory::checkName(name); !checked)
         return Failure{checked.reason()};
     auto directory = options.openDirectory();
@@ -60,17 +62,20 @@ Result<std::shared_ptr<LinuxLocalPort>> LinuxLocalPort::create(const std::string
     auto socket = listenOn(*directory, name);
     if (!socket)
         return Failure{socket.reason()};
-    return std::shared_ptr<LinuxLocalPort>(new LinuxLocalPort(
-        name, std::move(callback), options, *std::move(directory), **std::move(lock), *std::move(socket)));
+    return std::shared_ptr<LinuxLocalPort>(new LinuxLocalPort(name, std::move(callback), options,
+                                                              std::move(peers), *std::move(directory),
+                                                              **std::move(lock), *std::move(socket)));
 }
 
 LinuxLocalPort::LinuxLocalPort(std::string name, MessagePorts::MessageCallback callback, PortOptions options,
-                               PortDirectory directory, PortNameLock lock, FileDescriptor socket)
+                               std::shared_ptr<PortPeers> peers, PortDirectory directory, PortNameLock lock,
+                               FileDescriptor socket)
     : _name(std::move(name)),
       _callback(std::make_shared<const MessagePorts::MessageCallback>(std::move(callback))),
-      _options(std::move(options)), _directory(std::move(directory)), _lock(std::move(lock)),
-      _socket(std::move(socket)), _acceptPause([this] { _acceptWatch->setEnabled(true); }),
-      _serve([this] { serveQueued(); }) {}
+      _options(std::move(options)), _peers(std::move(peers)), _directory(std::move(directory)),
+      _lock(std::move(lock)), _socket(std::move(socket)),
+      _acceptPause([this] { _acceptWatch->setEnabled(true); }), _serve([this] { serveQueued(); }),
+      _idleCheck([this] { closeIdle(); }) {}
 
 LinuxLocalPort::~LinuxLocalPort() {
     close();
@@ -101,6 +106,7 @@ void LinuxLocalPort::close() {
     _acceptWatch.reset();
     _acceptPause.stop();
     _serve.stop();
+    _idleCheck.stop();
     _queued.clear();
     _connections.clear();
     _socket.reset();
@@ -145,14 +151,46 @@ bool LinuxLocalPort::handleAcceptError(int error) {
 void LinuxLocalPort::admit(FileDescriptor socket) {
     if (auto checked = checkPeerUser(socket.get(), _options.peerUser); !checked)
         return refuse(checked.reason());
+    if (isNearlyFull())
+        closeIdle();
     if (_connections.size() >= _options.maximumConnections)
         return refuse("a connection beyond " + std::to_string(_options.maximumConnections));
-    auto connection = std::make_shared<PortConnection>(std::move(socket));
+    auto connection = std::make_shared<PortConnection>(std::move(socket), _peers->memory());
     _connections.push_back(connection);
     connection->setReady([this, weak = std::weak_ptr(connection)] {
         if (const auto ready = weak.lock())
             queue(ready);
     });
+    if (isNearlyFull() && !_idleCheck.isRunning())
+        _idleCheck.startOnce(_options.idleTimeout / idleChecks);
+}
+
+bool LinuxLocalPort::isNearlyFull() const {
+    return _connections.size() >= _options.maximumConnections - _options.maximumConnections / 4;
+}
+
+void LinuxLocalPort::closeIdle() {
+    const auto since = std::chrono::steady_clock::now() - _options.idleTimeout;
+    const auto idle = [&](const Connection& connection) {
+        return connection->lastActive() <= since && (_closesIdle || connection->isIncomplete());
+    };
+    // The longest idle first, and no more than needed.
+    std::stable_sort(_connections.begin(), _connections.end(), [](const Connection& a, const Connection& b) {
+        return a->lastActive() < b->lastActive();
+    });
+    const auto connections = _connections; // which drop changes
+    for (const Connection& connection : connections) {
+        if (!isNearlyFull())
+            break;
+        if (!idle(connection))
+            continue;
+        _peers->log().format(LogPriority::Error, "closed idle connections",
+                             "Message port %s: closed a connection that is idle while %zu are open",
+                             _name.c_str(), _connections.size());
+        drop(connection);
+    }
+    if (isNearlyFull())
+        _idleCheck.startOnce(_options.idleTimeout / idleChecks);
 }
 
 void LinuxLocalPort::queue(const Connection& connection) {
@@ -184,8 +222,8 @@ void LinuxLocalPort::serveQueued() {
 LinuxLocalPort::Served LinuxLocalPort::serve(const Connection& connection, Budget& budget,
                                              const std::shared_ptr<LinuxLocalPort>& self) {
     const auto malformed = [this](const std::string& reason) {
-        logFormat(LogPriority::Error, "Message port %s: closed a connection: %s", _name.c_str(),
-                  reason.c_str());
+        _peers->log().format(LogPriority::Error, "closed connections",
+                             "Message port %s: closed a connection: %s", _name.c_str(), reason.c_str());
         return Served::Closed;
     };
     while (budget.messages > 0 && budget.bytes > 0) {
@@ -223,8 +261,9 @@ void LinuxLocalPort::deliver(PortConnection& connection, const Frame& frame) {
         return;
     Frame reply{FrameKind::Reply, answer.has_value(), frame.messageId, frame.serial, Data()};
     if (answer && answer->size() > maximumFramePayload) {
-        logFormat(LogPriority::Error, "Message port %s: a reply of %zu bytes, wanted at most %zu",
-                  _name.c_str(), answer->size(), maximumFramePayload);
+        _peers->log().format(LogPriority::Error, "replies that are too long",
+                             "Message port %s: a reply of %zu bytes, wanted at most %zu", _name.c_str(),
+                             answer->size(), maximumFramePayload);
         reply.hasData = false;
     } else if (answer) {
         reply.payload = *std::move(answer);
@@ -233,8 +272,8 @@ void LinuxLocalPort::deliver(PortConnection& connection, const Frame& frame) {
 }
 
 void LinuxLocalPort::refuse(const std::string& reason) {
-    if (_refusals.passes())
-        logFormat(LogPriority::Error, "Message port %s: refused %s", _name.c_str(), reason.c_str());
+    _peers->log().format(LogPriority::Error, "refused connections", "Message port %s: refused %s",
+                         _name.c_str(), reason.c_str());
 }
 
 void LinuxLocalPort::drop(const Connection& connection) {

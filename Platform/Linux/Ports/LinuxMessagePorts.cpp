@@ -28,16 +28,18 @@ private:
     std::string _name;
 };
 
-void logFailure(const std::string& name, const std::string& reason) {
-    logFormat(LogPriority::Error, "Message port %s: %s", name.c_str(), reason.c_str());
-}
-
 } // namespace
 
-LinuxMessagePorts::LinuxMessagePorts(PortOptions options) : _options(std::move(options)) {}
+LinuxMessagePorts::LinuxMessagePorts(PortOptions options)
+    : _options(std::move(options)), _peers(std::make_shared<PortPeers>(_options.frameMemory)) {}
+
+void LinuxMessagePorts::logFailure(const std::string& name, const std::string& reason) {
+    _peers->log().format(LogPriority::Error, "ports that failed", "Message port %s: %s", name.c_str(),
+                         reason.c_str());
+}
 
 MessagePorts::Created LinuxMessagePorts::createLocal(const std::string& name, MessageCallback callback) {
-    auto port = LinuxLocalPort::create(name, std::move(callback), _options);
+    auto port = LinuxLocalPort::create(name, std::move(callback), _options, _peers);
     if (!port) {
         logFailure(name, port.reason());
         return {};
@@ -48,7 +50,7 @@ MessagePorts::Created LinuxMessagePorts::createLocal(const std::string& name, Me
 }
 
 std::shared_ptr<RemotePort> LinuxMessagePorts::createRemote(const std::string& name) {
-    auto port = LinuxRemotePort::connect(name, _options);
+    auto port = LinuxRemotePort::connect(name, _options, _peers);
     if (port)
         return *std::move(port);
     logFailure(name, port.reason());

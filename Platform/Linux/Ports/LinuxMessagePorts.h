@@ -4,6 +4,7 @@
 #pragma once
 
 #include "Platform/Linux/Ports/PortOptions.h"
+#include "Platform/Linux/Ports/PortPeers.h"
 #include "Platform/MessagePort.h"
 
 namespace velmora {
@@ -18,7 +19,11 @@ public:
     [[nodiscard]] std::shared_ptr<RemotePort> createRemote(const std::string& name) override;
 
 private:
+    /// The name is a peer's where a service connects to its clients.
+    void logFailure(const std::string& name, const std::string& reason);
+
     PortOptions _options;
+    std::shared_ptr<PortPeers> _peers;
 };
 
 } // namespace velmora

@@ -5,6 +5,7 @@
 
 #include "Platform/Linux/Errno.h"
 #include "Platform/Linux/Ports/PeerUser.h"
+#include "Platform/Linux/Ports/SocketWait.h"
 #include "Platform/SystemLog.h"
 
 #include <fcntl.h>
@@ -29,27 +30,6 @@ constexpr std::size_t batchMessages = 64;
 constexpr std::size_t batchBytes = std::size_t{128} << 10;
 constexpr auto restartPollInterval = std::chrono::milliseconds(10);
 
-SteadyClock::time_point deadlineAfter(std::chrono::nanoseconds time) {
-    constexpr std::chrono::nanoseconds longest = std::chrono::hours(24 * 365); // the sum must not overflow
-    return SteadyClock::now() + std::clamp(time, std::chrono::nanoseconds::zero(), longest);
-}
-
-/// Blocks until the socket is ready for `events` or has ended; false when the deadline comes first.
-bool waitFor(int descriptor, short events, SteadyClock::time_point deadline) {
-    for (;;) {
-        const auto left = std::max(deadline - SteadyClock::now(), SteadyClock::duration::zero());
-        const auto seconds = std::chrono::floor<std::chrono::seconds>(left);
-        const timespec time = {static_cast<time_t>(seconds.count()),
-                               static_cast<long>((left - seconds).count())};
-        pollfd poll = {descriptor, events, 0};
-        const int ready = ::ppoll(&poll, 1, &time, nullptr);
-        if (ready >= 0)
-            return ready > 0;
-        if (errno != EINTR)
-            return false;
-    }
-}
-
 /// 0, or the errno value.
 int connectTo(const PortAddress& address, int descriptor) {
     while (::connect(descriptor, reinterpret_cast<const sockaddr*>(&address.address), address.size) != 0)
@@ -61,7 +41,8 @@ int connectTo(const PortAddress& address, int descriptor) {
 } // namespace
 
 Result<std::shared_ptr<LinuxRemotePort>> LinuxRemotePort::connect(const std::string& name,
-                                                                  const PortOptions& options) {
+                                                                  const PortOptions& options,
+                                                                  std::shared_ptr<PortPeers> peers) {
     if (auto checked = PortDirectory::checkName(name); !checked)
         return Failure{checked.reason()};
     auto directory = options.openDirectory();
@@ -94,19 +75,23 @@ Result<std::shared_ptr<LinuxRemotePort>> LinuxRemotePort::connect(const std::str
         return Failure{checked.reason()};
     if (::fcntl(socket.get(), F_SETFL, O_NONBLOCK) != 0)
         return Failure{"the socket cannot be set up: " + errnoText(errno)};
-    return std::shared_ptr<LinuxRemotePort>(new LinuxRemotePort(name, std::move(socket), options));
+    return std::shared_ptr<LinuxRemotePort>(
+        new LinuxRemotePort(name, std::move(socket), options, std::move(peers)));
 }
 
-LinuxRemotePort::LinuxRemotePort(std::string name, FileDescriptor socket, const PortOptions& options)
-    : _name(std::move(name)), _socket(std::move(socket)), _queue(options.queue),
-      _readWatch(std::make_unique<SocketWatch>(_socket.get(), SocketWatch::For::Reading,
-                                               [this] { readAvailable(); })),
+LinuxRemotePort::LinuxRemotePort(std::string name, FileDescriptor socket, const PortOptions& options,
+                                 std::shared_ptr<PortPeers> peers)
+    : _name(std::move(name)), _socket(std::move(socket)), _peers(std::move(peers)),
+      _reader(_peers->memory(), [this] { _gaveUp.startOnce(std::chrono::nanoseconds::zero()); }),
+      _queue(options.queue), _readWatch(std::make_unique<SocketWatch>(
+                                 _socket.get(), SocketWatch::For::Reading, [this] { readAvailable(); })),
       _writeWatch(std::make_unique<SocketWatch>(_socket.get(), SocketWatch::For::Writing,
                                                 [this] {
                                                     _blocked = false;
                                                     flushQueue();
                                                 })),
-      _droppedReport([this] { reportDropped(); }), _ended([this] { callInvalidationCallback(); }) {
+      _droppedReport([this] { reportDropped(); }), _ended([this] { callInvalidationCallback(); }),
+      _gaveUp([this] { discardReplies(); }) {
     _writeWatch->setEnabled(false);
 }
 
@@ -149,6 +134,7 @@ void LinuxRemotePort::close() {
     if (_unreported > 0)
         reportDropped();
     _droppedReport.stop();
+    _gaveUp.stop();
 }
 
 void LinuxRemotePort::callInvalidationCallback() {
@@ -235,8 +221,8 @@ std::optional<Frame> LinuxRemotePort::takeReply(std::uint32_t serial) {
         else if ((*next)->serial == serial)
             return *std::move(next);
         if (!fault.empty()) {
-            logFormat(LogPriority::Error, "Message port %s: closed the connection: %s", _name.c_str(),
-                      fault.c_str());
+            _peers->log().format(LogPriority::Error, "closed connections",
+                                 "Message port %s: closed the connection: %s", _name.c_str(), fault.c_str());
             connectionEnded();
             return std::nullopt;
         }
@@ -246,6 +232,10 @@ std::optional<Frame> LinuxRemotePort::takeReply(std::uint32_t serial) {
 void LinuxRemotePort::readAvailable() {
     if (_reader.readFrom(_socket.get()).outcome == FrameReader::Outcome::Ended)
         return connectionEnded();
+    discardReplies();
+}
+
+void LinuxRemotePort::discardReplies() {
     // Outside of sendRequest no reply is expected: all are discarded, since 0 is no request's serial.
     [[maybe_unused]] const auto none = takeReply(0);
 }
@@ -255,10 +245,9 @@ void LinuxRemotePort::post(std::int32_t messageId, const Data& payload) {
         return;
     if (payload.size() > maximumFramePayload) {
         ++_dropped;
-        if (_tooLong.passes())
-            logFormat(LogPriority::Error,
-                      "Message port %s: dropped a message of %zu bytes, wanted at most %zu", _name.c_str(),
-                      payload.size(), maximumFramePayload);
+        _peers->log().format(LogPriority::Error, "dropped messages",
+                             "Message port %s: dropped a message of %zu bytes, wanted at most %zu",
+                             _name.c_str(), payload.size(), maximumFramePayload);
         return;
     }
     if (const auto dropped = _queue.push({FrameKind::OneWay, true, messageId, 0, payload}); dropped > 0)

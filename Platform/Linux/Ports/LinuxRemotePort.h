@@ -4,11 +4,11 @@
 #pragma once
 
 #include "Platform/Linux/Files/FileDescriptor.h"
-#include "Platform/Linux/LogLimiter.h"
 #include "Platform/Linux/LoopTimer.h"
 #include "Platform/Linux/Ports/FrameQueue.h"
 #include "Platform/Linux/Ports/FrameReader.h"
 #include "Platform/Linux/Ports/PortOptions.h"
+#include "Platform/Linux/Ports/PortPeers.h"
 #include "Platform/Linux/Ports/SocketWatch.h"
 #include "Platform/MessagePort.h"
 
@@ -25,8 +25,8 @@ namespace velmora {
 class LinuxRemotePort final : public RemotePort, public std::enable_shared_from_this<LinuxRemotePort> {
 public:
     /// Connects; null when there is no such port. The failure says what went wrong otherwise.
-    static Result<std::shared_ptr<LinuxRemotePort>> connect(const std::string& name,
-                                                            const PortOptions& options);
+    static Result<std::shared_ptr<LinuxRemotePort>>
+    connect(const std::string& name, const PortOptions& options, std::shared_ptr<PortPeers> peers);
 
     ~LinuxRemotePort() override;
 
@@ -45,7 +45,8 @@ public:
 private:
     using Deadline = std::chrono::steady_clock::time_point;
 
-    LinuxRemotePort(std::string name, FileDescriptor socket, const PortOptions& options);
+    LinuxRemotePort(std::string name, FileDescriptor socket, const PortOptions& options,
+                    std::shared_ptr<PortPeers> peers);
 
     [[nodiscard]] std::int32_t sendNow(const Frame& frame, Deadline deadline);
     [[nodiscard]] Answer awaitReply(std::uint32_t serial, Deadline deadline);
@@ -53,6 +54,7 @@ private:
     /// frame ends the connection.
     [[nodiscard]] std::optional<Frame> takeReply(std::uint32_t serial);
     void readAvailable();
+    void discardReplies();
     void flushQueue();
     void countDropped(std::uint64_t count);
     void reportDropped();
@@ -64,17 +66,18 @@ private:
     std::string _name;
     std::function<void(RemotePort&)> _invalidationCallback;
     FileDescriptor _socket;
+    std::shared_ptr<PortPeers> _peers;
     FrameReader _reader;
     FrameQueue _queue;
     bool _blocked = false; ///< the last write would have blocked
     std::uint32_t _lastSerial = 0;
     std::uint64_t _dropped = 0;
     std::uint64_t _unreported = 0; ///< dropped messages that are not logged yet
-    LogLimiter _tooLong{std::chrono::seconds(1)};
     std::unique_ptr<SocketWatch> _readWatch;
     std::unique_ptr<SocketWatch> _writeWatch;
     LoopTimer _droppedReport;
     LoopTimer _ended;
+    LoopTimer _gaveUp; ///< the reader has
 };
 
 } // namespace velmora

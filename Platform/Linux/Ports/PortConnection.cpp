@@ -12,9 +12,19 @@ constexpr std::size_t maximumWaitingBytes = std::size_t{1} << 20;
 
 } // namespace
 
-PortConnection::PortConnection(FileDescriptor socket)
-    : _socket(std::move(socket)), _readWatch(std::make_unique<SocketWatch>(
-                                      _socket.get(), SocketWatch::For::Reading, [this] { becomeReady(); })) {}
+PortConnection::PortConnection(FileDescriptor socket, std::shared_ptr<FrameMemory> memory)
+    : _socket(std::move(socket)), _reader(std::move(memory), [this] { becomeReady(); }),
+      _readWatch(std::make_unique<SocketWatch>(_socket.get(), SocketWatch::For::Reading,
+                                               [this] { becomeReady(); })) {}
+
+Result<std::optional<Frame>> PortConnection::next() {
+    auto frame = _reader.next();
+    if (frame && *frame) {
+        _hasSent = true;
+        _lastActive = std::chrono::steady_clock::now();
+    }
+    return frame;
+}
 
 FrameReader::Read PortConnection::read() {
     if (_broken)

@@ -4,6 +4,7 @@
 #include "Platform/Linux/Ports/PortDirectory.h"
 
 #include "Platform/Linux/Errno.h"
+#include "Platform/MessagePort.h"
 
 #include <fcntl.h>
 #include <sys/stat.h>
@@ -18,7 +19,6 @@ namespace velmora {
 
 namespace {
 
-constexpr std::size_t maximumNameSize = 80;
 constexpr mode_t forOthers = S_IRWXG | S_IRWXO;
 constexpr mode_t writableByOthers = S_IWGRP | S_IWOTH;
 
@@ -79,9 +79,9 @@ Result<Done> PortDirectory::checkName(std::string_view name) {
     if (name.empty())
         return Failure{"an empty port name"};
     const std::string found = "port name \"" + std::string(name) + "\"";
-    if (name.size() > maximumNameSize)
+    if (name.size() > maximumPortNameSize)
         return Failure{found + " of " + std::to_string(name.size()) + " bytes, wanted at most " +
-                       std::to_string(maximumNameSize)};
+                       std::to_string(maximumPortNameSize)};
     if (name.front() == '.')
         return Failure{found + " begins with '.'"};
     if (name.find('/') != name.npos || name.find('\0') != name.npos)

@@ -3,6 +3,7 @@
 
 #pragma once
 
+#include "Platform/Linux/Ports/FrameMemory.h"
 #include "Platform/Linux/Ports/FrameQueue.h"
 #include "Platform/Linux/Ports/PortDirectory.h"
 
@@ -26,6 +27,11 @@ struct PortOptions {
     FrameQueue::Limits queue;
     /// Maximum simultaneous connections of a local port; further ones are refused.
     std::size_t maximumConnections = 64;
+    /// From three quarters of that number on, a connection that asks for nothing or leaves a frame unfinished
+    /// for so long is closed.
+    std::chrono::nanoseconds idleTimeout = std::chrono::seconds(10);
+    /// What the unfinished frames of all connections may take together, in bytes.
+    std::size_t frameMemory = FrameMemory::defaultLimit;
     /// How long connecting may block when the peer's queue of new connections is full.
     std::chrono::nanoseconds connectTimeout = std::chrono::seconds(1);
     /// How long connecting may block when the port's owner has crashed, in case it is being restarted.

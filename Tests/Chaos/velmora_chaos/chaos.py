@@ -7,6 +7,8 @@ from collections.abc import Callable, Mapping, Sequence
 
 from velmora_chaos.checks import Problem
 from velmora_chaos.clients import run_clients
+from velmora_chaos.closed import run_closed
+from velmora_chaos.crowd import run_crowd
 from velmora_chaos.flood import run_flood
 from velmora_chaos.hostile import run_hostile
 from velmora_chaos.options import Options, parse_options
@@ -19,6 +21,8 @@ EXPERIMENTS: Mapping[str, Experiment] = {
     "application_restarts": lambda options: run_restarts(options, Victim.APPLICATION),
     "clients": run_clients,
     "hostile": run_hostile,
+    "crowd": run_crowd,
+    "closed": run_closed,
     "flood": run_flood,
 }
 

@@ -7,8 +7,9 @@ import random
 import struct
 
 from velmora_chaos.raw_client import HEADER, ONE_WAY, REPLY, REQUEST, frame
+from velmora_chaos.sandbox import SERVER_PORT
 
-VARIANTS = 9
+VARIANTS = 10
 
 
 def malformed_input(chance: random.Random) -> bytes:
@@ -34,4 +35,7 @@ def malformed_variant(variant: int, chance: random.Random) -> bytes:
         return frame(REQUEST, plistlib.dumps({"CreateLogChannel": "x" * chance.randrange(1, 300)}), 9)
     if variant == 7:  # log codes that are not numbers
         return frame(ONE_WAY, plistlib.dumps({"SetState": "Streaming", "SetOstrelLogCodes": ["all"]}))
+    if variant == 8:  # a log channel to the service itself
+        own = chance.choice([SERVER_PORT, f"{SERVER_PORT}.channel.1"])
+        return frame(REQUEST, plistlib.dumps({"CreateLogChannel": own}), 10)
     return b""

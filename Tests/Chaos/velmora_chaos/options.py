@@ -14,6 +14,9 @@ DESCRIPTION = """Stress tests of the telephony service and the application, obse
   clients   ten clients at once beside one that never reads and one that sends malformed frames
   hostile   a thousand hostile connections, to the service, its log channel and the application, beside an
             honest client that misses at most one redraw
+  crowd     as many idle connections as a port takes, unfinished frames of 180 MiB, and requests for channels to
+            the service itself: a new client is served, memory and the log stay bounded
+  closed    the service and a recorder without standard descriptors: no log line goes into another file
   flood     100,000 messages a second: the screen answers in time, memory stays bounded, and what a slow
             client does not take is counted and logged
 """

@@ -31,6 +31,10 @@ class Program:
         """Sends a signal to the program."""
         self._process.send_signal(number)
 
+    def wait(self) -> int:
+        """Its exit status, once it has ended by itself."""
+        return self._process.wait(END_S)
+
     def kill(self) -> None:
         """Ends the program with SIGKILL if it still runs, and releases its process and its output."""
         if self._process.poll() is None:

@@ -76,6 +76,19 @@ class Sandbox:
         """A live display on a pipe."""
         return self._start("velmora-log", "watch")
 
+    def start_closed(self, program: str, *arguments: str) -> Program:
+        """A program with the descriptors 0 to 2 closed."""
+        process = subprocess.Popen(
+            ["/bin/sh", "-c", 'exec "$@" <&- >&- 2>&-', "sh", str(self._build / program), *arguments],
+            env=self.environment,
+            text=True,
+            stdout=subprocess.PIPE,
+        )
+        assert process.stdout is not None
+        started = Program(process, process.stdout)
+        self._started.append(started)
+        return started
+
     def _start(self, program: str, *arguments: str, reads_errors: bool = False) -> Program:
         process = subprocess.Popen(
             [str(self._build / program), *arguments],

@@ -28,6 +28,7 @@ class UnusablePlace:
     texts: Sequence[str]
     environment: Mapping[str, str] = field(default_factory=dict)
     output: Path | None = None  # instead of a file that is read
+    is_closed: bool = False  # whether the descriptors 0 to 2 are closed, so that nothing is printed
 
     def check(self, build: Path, directory: Path) -> None:
         """Runs the command; raises Problem for another status, a missing text or a changed file."""
@@ -38,7 +39,7 @@ class UnusablePlace:
         placed = {key: self._placed(value, directory) for key, value in self.environment.items()}
         with Sandbox(build, directory) as sandbox, output.open("w", encoding="utf-8") as stream:
             ended = subprocess.run(
-                [str(build / self.command[0]), *(self._placed(word, directory) for word in self.command[1:])],
+                self._started(build, directory),
                 env={**sandbox.environment, **placed},
                 stdout=stream,
                 stderr=subprocess.PIPE,
@@ -53,7 +54,13 @@ class UnusablePlace:
         for text in self.texts:
             wanted = self._placed(text, directory)
             expect(wanted in printed, f"{self.name}: did not print {wanted}\n{ended.stderr}")
+        if self.is_closed:
+            expect(not printed, f"{self.name}: printed {printed}")
         expect(file.read_bytes() == OLD, f"{self.name}: a file has changed")
+
+    def _started(self, build: Path, directory: Path) -> list[str]:
+        words = [str(build / self.command[0]), *(self._placed(word, directory) for word in self.command[1:])]
+        return ["/bin/sh", "-c", 'exec "$@" <&- >&- 2>&-', "sh", *words] if self.is_closed else words
 
     @staticmethod
     def _placed(word: str, directory: Path) -> str:

@@ -72,4 +72,26 @@ def all_unusable_places() -> list[UnusablePlace]:
             ["GSM Serving Cell"],
             {"VELMORA_RESOURCES": "@resources"},
         ),
+        UnusablePlace(
+            "decode without standard descriptors",
+            ["velmora-log", "--log-level", "7", "--verbose", "decode", gsm],
+            0,
+            [],
+            is_closed=True,
+        ),
+        UnusablePlace(
+            "service with an unknown source, without standard descriptors",
+            ["velmora-telephonyd", "--source", "none"],
+            2,
+            [],
+            is_closed=True,
+        ),
+        UnusablePlace(
+            "record without standard descriptors or a port directory",
+            [*record, "@new.pcapng"],
+            1,
+            [],
+            no_ports,
+            is_closed=True,
+        ),
     ]
