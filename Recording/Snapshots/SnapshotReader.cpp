@@ -16,6 +16,13 @@ namespace velmora {
 
 namespace {
 
+/// A history has five refreshes, each with the object of one message and its display, which has no more
+/// values than that; and a few values about each.
+constexpr PropertyListLimits snapshotLimits{
+    .maximumObjects = 11 * messageLimits.maximumObjects,
+    .maximumMemory = std::size_t{512} << 20,
+};
+
 /// How far apart the application's refreshes are.
 constexpr std::chrono::seconds refreshInterval(2);
 
@@ -46,13 +53,12 @@ Result<Data> serialized(const Value& value) {
 }
 
 Result<Value> readAll(ChunkedInput& input) {
-    const PropertyListLimits limits;
-    if (input.ensure(limits.maximumBytes + 1))
-        return Failure{"property list of more than " + std::to_string(limits.maximumBytes) +
+    if (input.ensure(snapshotLimits.maximumBytes + 1))
+        return Failure{"property list of more than " + std::to_string(snapshotLimits.maximumBytes) +
                        " bytes, wanted a snapshot of at most that"};
     if (input.failure())
         return *input.failure();
-    return readPropertyList(input.available(), limits);
+    return readPropertyList(input.available(), snapshotLimits);
 }
 
 } // namespace
