@@ -4,7 +4,7 @@
 #include "Tools/Info/InfoText.h"
 
 #include "Platform/DateText.h"
-#include "Tools/Text/PrintableText.h"
+#include "Platform/PrintableText.h"
 
 #include <chrono>
 #include <cinttypes>

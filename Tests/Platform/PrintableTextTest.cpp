@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Tools/Text/PrintableText.h"
+#include "Platform/PrintableText.h"
 
 #include <gtest/gtest.h>
 
