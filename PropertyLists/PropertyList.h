@@ -50,6 +50,10 @@ Result<std::string> writeXMLPropertyList(const Value& root);
 /// 9999, and nesting deeper than the reader's default limit.
 Result<std::vector<std::uint8_t>> writeBinaryPropertyList(const Value& root);
 
+/// The XML form, or the binary form where a text holds what XML cannot represent: the bytes of either, which
+/// give an equal value when they are read. Fails for what the binary form fails for.
+Result<std::string> writePropertyList(const Value& root);
+
 /// The reader of the binary form only, regardless of the input's first bytes.
 Result<Value> readBinaryPropertyList(Bytes input, const PropertyListLimits& limits);
 

@@ -42,16 +42,6 @@ bool isDisplayTree(const Value& value) {
     return value.asString() != nullptr;
 }
 
-/// XML as far as it goes: the binary form carries every text.
-Result<Data> serialized(const Value& value) {
-    if (const Result<std::string> xml = writeXMLPropertyList(value))
-        return Data(std::vector<std::uint8_t>(xml->begin(), xml->end()));
-    Result<std::vector<std::uint8_t>> binary = writeBinaryPropertyList(value);
-    if (!binary)
-        return Failure{binary.reason()};
-    return Data(*std::move(binary));
-}
-
 Result<Value> readAll(ChunkedInput& input) {
     if (input.ensure(snapshotLimits.maximumBytes + 1))
         return Failure{"property list of more than " + std::to_string(snapshotLimits.maximumBytes) +
@@ -160,15 +150,16 @@ void SnapshotReader::openObject(const Value& object) {
         addRecordLoss(0, place() + "object that holds other kinds than string, array and dictionary");
         return;
     }
-    Result<Data> message = serialized(object);
-    if (!message) {
-        addRecordLoss(0, place() + message.reason());
-    } else if (message->size() > maximumMessageSize) {
-        addRecordLoss(message->size(), place() + "object of " + std::to_string(message->size()) +
-                                           " bytes, wanted at most " + std::to_string(maximumMessageSize));
+    const Result<std::string> list = writePropertyList(object);
+    if (!list) {
+        addRecordLoss(0, place() + list.reason());
+    } else if (list->size() > maximumMessageSize) {
+        addRecordLoss(list->size(), place() + "object of " + std::to_string(list->size()) +
+                                        " bytes, wanted at most " + std::to_string(maximumMessageSize));
     } else {
         countRecord();
-        _pending = LoggedMessage{_begin, *std::move(message), number(), 0};
+        _pending =
+            LoggedMessage{_begin, Data(std::vector<std::uint8_t>(list->begin(), list->end())), number(), 0};
     }
 }
 

@@ -60,15 +60,13 @@ TEST_F(InfoCommandTest, CountsMessagesByLogCodeWithTheirSections) {
 
 TEST_F(InfoCommandTest, ASnapshotsDescriptionIsShown) {
     writeRecording("drive.pcapng", "Ostrel_GSM", {{at(0), rrState(5)}});
+    // XML cannot hold an escape character, the binary form can.
     ToolProcess made(
         tool({"convert", "--description", "gate 4,\nroof\x1b", path("drive.pcapng"), path("drive.velmora")}));
-    ASSERT_EQ(made.exitStatus(), 1) << "XML cannot hold an escape character";
-    ToolProcess second(
-        tool({"convert", "--description", "gate 4,\nroof", path("drive.pcapng"), path("drive.velmora")}));
-    ASSERT_EQ(second.exitStatus(), 0);
+    ASSERT_EQ(made.exitStatus(), 0);
     ToolProcess process(tool({"info", path("drive.velmora")}));
     EXPECT_EQ(process.exitStatus(), 0);
-    EXPECT_THAT(process.output(), testing::HasSubstr("lost:       0\ndescribed:  gate 4,\\nroof\n\n"));
+    EXPECT_THAT(process.output(), testing::HasSubstr("lost:       0\ndescribed:  gate 4,\\nroof\\x1B\n\n"));
     EXPECT_THAT(process.output(), testing::Not(testing::HasSubstr("comments:")));
 }
 
