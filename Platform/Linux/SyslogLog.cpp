@@ -3,6 +3,8 @@
 
 #include "Platform/Linux/SyslogLog.h"
 
+#include "Platform/PrintableText.h"
+
 #include <syslog.h>
 
 #include <algorithm>
@@ -21,8 +23,9 @@ SyslogLog::~SyslogLog() {
 
 void SyslogLog::write(int priority, std::string_view text) {
     constexpr std::size_t longest = std::numeric_limits<int>::max();
-    ::syslog(priority & (LOG_PRIMASK | LOG_FACMASK), "%.*s", static_cast<int>(std::min(text.size(), longest)),
-             text.data());
+    const std::string line = printableLine(text); // which may say what another program or a file says
+    ::syslog(priority & (LOG_PRIMASK | LOG_FACMASK), "%.*s", static_cast<int>(std::min(line.size(), longest)),
+             line.data());
 }
 
 } // namespace velmora

@@ -115,6 +115,19 @@ TEST(LinuxSyslogLog, LinesGoToSyslogUnderTheProgramsName) {
                                          std::to_string((3 << 3) | 5) + " cut", "close"));
 }
 
+TEST_F(LinuxStderrLog, WhatOthersSayControlsNoTerminal) {
+    StderrLog log(_near.get());
+    log.write(3, "no port named \x1b]0;title\a\u202Egnp.exe\r\n");
+    EXPECT_THAT(writes(), ElementsAre("<3>no port named \\x1B]0;title\\x07\\u{202E}gnp.exe\\r\n"));
+}
+
+TEST(LinuxSyslogLog, WhatOthersSayIsOneLine) {
+    syslogCalls.clear();
+    SyslogLog("velmora").write(3, "no port named a\n<0>forged\x1b[1m\n");
+    EXPECT_THAT(syslogCalls,
+                ElementsAre("open velmora with pid as user", "3 no port named a <0>forged\\x1B[1m", "close"));
+}
+
 TEST(LinuxProgramLog, TheOptionsChooseTheLogAndTheLevel) {
     EXPECT_EQ(logKindNamed("syslog"), LogKind::Syslog);
     EXPECT_EQ(logKindNamed("stderr"), LogKind::Stderr);
