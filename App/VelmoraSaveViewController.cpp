@@ -70,8 +70,7 @@ std::string VelmoraSaveViewController::snapshotPath() const {
 
 bool VelmoraSaveViewController::writeSnapshot(const std::string& path) const {
     try {
-        const auto list =
-            writeXMLPropertyList(makeSnapshot(_timeStamp, _saveHistory, _saveDescription.text()));
+        const auto list = writePropertyList(makeSnapshot(_timeStamp, _saveHistory, _saveDescription.text()));
         const auto written =
             list ? _app.platform().files().writeDirectly(path, *list) : Failure{list.reason()};
         if (!written)

@@ -11,13 +11,16 @@
 #include "Platform/Linux/ServiceStarter.h"
 #include "Platform/Linux/StandardDescriptors.h"
 #include "Platform/Linux/Termination.h"
+#include "Platform/PrintableText.h"
 #include "Platform/SystemLog.h"
 
 #include <CLI/CLI.hpp>
 
 #include <chrono>
 #include <cstdio>
+#include <iostream>
 #include <memory>
+#include <sstream>
 #include <string>
 
 namespace {
@@ -107,7 +110,10 @@ int main(int argc, char** argv) {
     try {
         app.parse(argc, argv);
     } catch (const CLI::ParseError& error) {
-        return app.exit(error) == 0 ? done : badUsage;
+        std::ostringstream words;
+        const bool isDone = app.exit(error, std::cout, words) == 0;
+        std::fputs(printableLines(words.str()).c_str(), stderr);
+        return isDone ? done : badUsage;
     }
     return show(options, argv[0]);
 }

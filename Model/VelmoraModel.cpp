@@ -144,7 +144,7 @@ void VelmoraModel::configureGenerator() {
         logLine(LogPriority::Error, " ***** No response to GetTechnology; cannot configure");
         return;
     }
-    const Result<Value> reply = readPropertyList(answer.reply->bytes());
+    const Result<Value> reply = readPropertyList(answer.reply->bytes(), messageLimits);
     if (!reply) {
         logLine(LogPriority::Error, " ***** Could not parse reply to GetTechnology; cannot configure");
         return;

@@ -5,8 +5,10 @@
 #include "PropertyLists/BinaryObjectTable.h"
 #include "PropertyLists/BinaryScalars.h"
 #include "PropertyLists/PropertyList.h"
+#include "PropertyLists/ReadingBudget.h"
 
 #include <algorithm>
+#include <optional>
 #include <string_view>
 #include <utility>
 
@@ -19,8 +21,7 @@ namespace {
 class Reader {
 public:
     Reader(const BinaryObjectTable& table, const PropertyListLimits& limits)
-        : _table(table), _limits(limits), _objectsLeft(limits.maximumObjects),
-          _contentLeft(limits.maximumBytes) {}
+        : _table(table), _limits(limits), _budget(limits) {}
 
     Result<Value> read() {
         Value root;
@@ -37,6 +38,7 @@ private:
     bool failAt(std::size_t offset, const std::string& reason) {
         return fail(failureAt(offset, reason).reason);
     }
+    bool isAllowed(std::optional<Failure> excess) { return !excess || fail(std::move(excess->reason)); }
 
     bool take(Result<Value> scalar, Value& value) {
         if (!scalar)
@@ -57,13 +59,10 @@ private:
     bool readArray(const BinaryObject& object, std::size_t depth, Value& value);
     bool readDictionary(const BinaryObject& object, std::size_t depth, Value& value);
     bool enterContainer(const BinaryObject& object, std::size_t depth, std::size_t referencesAnEntry);
-    bool takeContent(const BinaryObject& object, std::size_t size);
 
     const BinaryObjectTable& _table;
     const PropertyListLimits& _limits;
-    std::size_t _objectsLeft;
-    /// Bytes that text and data may still take: a short list can refer to a long string very often.
-    std::size_t _contentLeft;
+    ReadingBudget _budget;
     std::string _reason;
     /// Offsets of the arrays and dictionaries that are being read, outermost first.
     std::vector<std::size_t> _open;
@@ -75,10 +74,8 @@ bool Reader::readCount(BinaryObject& object) {
 }
 
 bool Reader::readObject(std::uint64_t index, std::size_t depth, Value& value) {
-    if (_objectsLeft == 0)
-        return fail("the list has more than " + std::to_string(_limits.maximumObjects) + " objects");
-    --_objectsLeft;
-
+    if (!isAllowed(_budget.takeObject()))
+        return false;
     const auto found = _table.object(index);
     if (!found)
         return fail(found.reason());
@@ -102,20 +99,12 @@ bool Reader::readObject(std::uint64_t index, std::size_t depth, Value& value) {
     return failAt(object.offset, "marker " + hexByte(object.marker) + " stands for no value that is read");
 }
 
-bool Reader::takeContent(const BinaryObject& object, std::size_t size) {
-    if (size > _contentLeft)
-        return failAt(object.offset, "text and data, repeated ones counted, have more than " +
-                                         std::to_string(_limits.maximumBytes) + " bytes");
-    _contentLeft -= size;
-    return true;
-}
-
 bool Reader::readData(const BinaryObject& object, Value& value) {
     if (object.count > bytesLeft(object))
         return failAt(object.offset, "data has " + std::to_string(object.count) + " bytes, " +
                                          std::to_string(bytesLeft(object)) + " are left");
     const auto size = static_cast<std::size_t>(object.count);
-    if (!takeContent(object, size))
+    if (!isAllowed(_budget.takeBytes(size)))
         return false;
     value = Data::copyOf(_table.bytesAt(object.content, size));
     return true;
@@ -126,7 +115,7 @@ bool Reader::readASCII(const BinaryObject& object, Value& value) {
         return failAt(object.offset, "a string has " + std::to_string(object.count) + " bytes, " +
                                          std::to_string(bytesLeft(object)) + " are left");
     const auto size = static_cast<std::size_t>(object.count);
-    if (!takeContent(object, size))
+    if (!isAllowed(_budget.takeBytes(size)))
         return false;
     const Bytes bytes = _table.bytesAt(object.content, size);
     const auto notASCII =
@@ -158,7 +147,7 @@ bool Reader::readUTF16(const BinaryObject& object, Value& value) {
             return failAt(offset, "a UTF-16 string holds half a surrogate pair");
         appendUTF8(text, character);
     }
-    if (!takeContent(object, text.size()))
+    if (!isAllowed(_budget.takeBytes(text.size())))
         return false;
     value = Value(std::move(text));
     return true;
@@ -172,8 +161,8 @@ bool Reader::enterContainer(const BinaryObject& object, std::size_t depth, std::
     if (object.count > left / (referencesAnEntry * _table.referenceSize()))
         return failAt(object.offset, std::string(name) + " has " + std::to_string(object.count) +
                                          " entries, " + std::to_string(left) + " bytes are left");
-    if (object.count > _objectsLeft / referencesAnEntry)
-        return fail("the list has more than " + std::to_string(_limits.maximumObjects) + " objects");
+    if (object.count > _budget.objects() / referencesAnEntry)
+        return fail(_budget.tooManyObjects().reason);
     if (std::find(_open.begin(), _open.end(), object.offset) != _open.end())
         return failAt(object.offset, std::string(name) + " contains itself");
     if (depth > _limits.maximumDepth)
@@ -225,6 +214,8 @@ bool Reader::readDictionary(const BinaryObject& object, std::size_t depth, Value
         if (!keyText)
             return failAt(keyReference, "a dictionary's key is of the kind " +
                                             std::string(nameOf(key.kind())) + ", not string");
+        if (!isAllowed(_budget.takeBytes(keyText->size())))
+            return false;
         Value element;
         if (!readObject(_table.numberAt(valueReference, _table.referenceSize()), depth + 1, element))
             return false;
@@ -239,8 +230,8 @@ bool Reader::readDictionary(const BinaryObject& object, std::size_t depth, Value
 
 Result<Value> readBinaryPropertyList(Bytes input, const PropertyListLimits& limits) {
     if (input.size() > limits.maximumBytes)
-        return Failure{"the list has " + std::to_string(input.size()) + " bytes, more than " +
-                       std::to_string(limits.maximumBytes)};
+        return limitExceeded(limits, "the list has " + std::to_string(input.size()) + " bytes, more than " +
+                                         std::to_string(limits.maximumBytes));
     const auto table = BinaryObjectTable::open(input);
     if (!table)
         return Failure{table.reason()};

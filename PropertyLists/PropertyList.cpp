@@ -18,4 +18,13 @@ Result<Value> readPropertyList(Bytes input, const PropertyListLimits& limits) {
     return isBinary ? readBinaryPropertyList(input, limits) : readXMLPropertyList(input, limits);
 }
 
+Result<std::string> writePropertyList(const Value& root) {
+    if (Result<std::string> xml = writeXMLPropertyList(root))
+        return xml;
+    const auto binary = writeBinaryPropertyList(root);
+    if (!binary)
+        return Failure{binary.reason()};
+    return std::string(binary->begin(), binary->end());
+}
+
 } // namespace velmora

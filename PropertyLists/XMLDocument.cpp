@@ -4,6 +4,7 @@
 #include "PropertyLists/XMLDocument.h"
 
 #include "PropertyLists/PugixmlMemoryBudget.h"
+#include "PropertyLists/ReadingBudget.h"
 #include "PropertyLists/XMLText.h"
 
 #include <algorithm>
@@ -38,8 +39,8 @@ std::size_t XMLDocument::offsetOf(pugi::xml_node node) const {
 
 Result<Done> XMLDocument::parse(Bytes input, const PropertyListLimits& limits) {
     if (input.size() > limits.maximumBytes)
-        return Failure{"the list has " + std::to_string(input.size()) + " bytes, more than " +
-                       std::to_string(limits.maximumBytes)};
+        return limitExceeded(limits, "the list has " + std::to_string(input.size()) + " bytes, more than " +
+                                         std::to_string(limits.maximumBytes));
     _text.resize(input.size());
     std::copy(input.begin(), input.end(), _text.begin());
     // This also keeps zero bytes away from pugixml, which ends there.
@@ -59,8 +60,8 @@ Result<Done> XMLDocument::parse(Bytes input, const PropertyListLimits& limits) {
     if (result.status == pugi::status_out_of_memory && !budget.isExhausted())
         throw std::bad_alloc();
     if (result.status == pugi::status_out_of_memory)
-        return Failure{"the list has more tags and attributes than " + std::to_string(limits.maximumObjects) +
-                       " objects need"};
+        return limitExceeded(limits, "the list has more tags and attributes than " +
+                                         std::to_string(limits.maximumObjects) + " objects need");
     std::string description = result.description();
     description[0] = static_cast<char>(std::tolower(static_cast<unsigned char>(description[0])));
     return failureAt(static_cast<std::size_t>(std::max<std::ptrdiff_t>(result.offset, 0)), description);

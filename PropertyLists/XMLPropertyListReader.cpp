@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: MIT
 
 #include "PropertyLists/PropertyList.h"
+#include "PropertyLists/ReadingBudget.h"
 #include "PropertyLists/XMLDocument.h"
 #include "PropertyLists/XMLScalars.h"
 #include "PropertyLists/XMLText.h"
@@ -9,8 +10,10 @@
 #include <pugixml.hpp>
 
 #include <algorithm>
+#include <optional>
 #include <string>
 #include <string_view>
+#include <utility>
 
 namespace velmora {
 
@@ -35,7 +38,7 @@ bool isSpace(std::string_view text) {
 class Reader {
 public:
     Reader(const XMLDocument& document, const PropertyListLimits& limits)
-        : _document(document), _limits(limits), _objectsLeft(limits.maximumObjects) {}
+        : _document(document), _limits(limits), _budget(limits) {}
 
     Result<Value> read() {
         Value root;
@@ -55,6 +58,7 @@ private:
     bool failAt(pugi::xml_node node, const std::string& reason) {
         return failAt(_document.offsetOf(node), reason);
     }
+    bool isAllowed(std::optional<Failure> excess) { return !excess || fail(std::move(excess->reason)); }
 
     bool readDocument(Value& value);
     bool readPlist(pugi::xml_node plist, Value& value);
@@ -64,13 +68,12 @@ private:
     bool readScalar(pugi::xml_node element, std::string_view name, Value& value);
     bool readText(pugi::xml_node element, std::string& text);
     bool appendUnescaped(std::string_view piece, std::size_t offset, std::string& text);
-    bool takeObject();
     bool expectNoText(pugi::xml_node element);
     bool nextElement(pugi::xml_node parent, pugi::xml_node& element);
 
     const XMLDocument& _document;
     const PropertyListLimits& _limits;
-    std::size_t _objectsLeft;
+    ReadingBudget _budget;
     std::string _reason;
 };
 
@@ -119,15 +122,8 @@ bool Reader::readPlist(pugi::xml_node plist, Value& value) {
     return !element || failAt(element, "a second value in <plist>");
 }
 
-bool Reader::takeObject() {
-    if (_objectsLeft == 0)
-        return fail("the list has more than " + std::to_string(_limits.maximumObjects) + " objects");
-    --_objectsLeft;
-    return true;
-}
-
 bool Reader::readValue(pugi::xml_node element, std::size_t depth, Value& value) {
-    if (!takeObject())
+    if (!isAllowed(_budget.takeObject()))
         return false;
     const std::string_view name = element.name();
     const bool isArray = name == "array";
@@ -169,7 +165,8 @@ bool Reader::readDictionary(pugi::xml_node element, std::size_t depth, Value& va
         if (std::string_view(child.name()) != "key")
             return failAt(child, "<" + std::string(child.name()) + "> where a <key> was wanted");
         const pugi::xml_node keyElement = child;
-        if (!takeObject() || !readText(keyElement, key) || !nextElement(element, child))
+        if (!isAllowed(_budget.takeObject()) || !readText(keyElement, key) ||
+            !isAllowed(_budget.takeBytes(2 * key.size())) || !nextElement(element, child))
             return false;
         if (!child)
             return failAt(keyElement, "the key " + quoted(key) + " has no value");
@@ -198,6 +195,8 @@ bool Reader::readScalar(pugi::xml_node element, std::string_view name, Value& va
                       "<" + std::string(name) + "> holds " + quoted(text) + ", not " + std::string(what));
     };
     if (isString) {
+        if (!isAllowed(_budget.takeBytes(text.size())))
+            return false;
         value = Value(std::move(text));
         return true;
     }
@@ -222,6 +221,8 @@ bool Reader::readScalar(pugi::xml_node element, std::string_view name, Value& va
     }
     if (name == "data") {
         const auto data = dataOfXML(text);
+        if (data && !isAllowed(_budget.takeBytes(data->size())))
+            return false;
         value = data ? Value(*data) : Value();
         return data || wanted("base64");
     }

@@ -11,6 +11,7 @@
 #include "Platform/Linux/SignalWatcher.h"
 #include "Platform/Linux/StandardDescriptors.h"
 #include "Platform/Linux/Termination.h"
+#include "Platform/PrintableText.h"
 #include "Platform/SystemLog.h"
 #include "Telephony/Service/LogServer.h"
 #include "Telephony/Sources/SourceFactory.h"
@@ -20,6 +21,8 @@
 
 #include <csignal>
 #include <cstdio>
+#include <iostream>
+#include <sstream>
 #include <string>
 
 namespace {
@@ -57,6 +60,10 @@ void declare(CLI::App& app, Options& options) {
     app.footer(velmora::sourceHelp(program));
 }
 
+void complain(const std::string& reason) {
+    std::fprintf(stderr, "%s: %s\n", program, velmora::printableLine(reason).c_str());
+}
+
 int serve(const Options& options, const velmora::SourceChoice& choice) {
     using namespace velmora;
     // Before the main loop, so that the last lines of what it serves are still written.
@@ -69,7 +76,7 @@ int serve(const Options& options, const velmora::SourceChoice& choice) {
 
     const auto source = makeSource(choice, queue, clock);
     if (!source) {
-        std::fprintf(stderr, "%s: %s\n", program, source.reason().c_str());
+        complain(source.reason());
         return badInput;
     }
     // Before there are sockets that a signal would leave in the file system.
@@ -80,7 +87,7 @@ int serve(const Options& options, const velmora::SourceChoice& choice) {
     LogServer server(ports, queue, **source);
     const auto listening = server.listen([&loop] { loop.quit(badInput); });
     if (!listening) {
-        std::fprintf(stderr, "%s: %s\n", program, listening.reason().c_str());
+        complain(listening.reason());
         return badInput;
     }
     const std::string serving = std::string("serving ").append(options.source);
@@ -103,11 +110,14 @@ int main(int argc, char** argv) {
     try {
         app.parse(argc, argv);
     } catch (const CLI::ParseError& error) {
-        return app.exit(error) == 0 ? done : badUsage;
+        std::ostringstream words;
+        const bool isDone = app.exit(error, std::cout, words) == 0;
+        std::fputs(velmora::printableLines(words.str()).c_str(), stderr);
+        return isDone ? done : badUsage;
     }
     const auto choice = velmora::parseSource(options.source);
     if (!choice) {
-        std::fprintf(stderr, "%s: %s\n", program, choice.reason().c_str());
+        complain(choice.reason());
         return badUsage;
     }
     return serve(options, *choice);

@@ -28,7 +28,7 @@ Font Font::named(std::string family, double size) {
 
 Size sizeOfText(std::string_view text, const Font& font) {
     const QFontMetricsF metrics(toQt(font));
-    return {metrics.horizontalAdvance(toQt(text).replace(u'\n', u' ')), metrics.height()};
+    return {metrics.horizontalAdvance(escapedLine(toQt(text))), metrics.height()};
 }
 
 } // namespace velmora

@@ -3,6 +3,7 @@
 
 #include "Tools/CommandLine.h"
 
+#include "Platform/PrintableText.h"
 #include "Tools/CommandOptions.h"
 #include "Tools/ExitStatus.h"
 
@@ -82,8 +83,9 @@ CommandLine parseCommandLine(int count, const char* const* arguments) {
         if (app.exit(error, out, ignored) == 0)
             line.command = CommandLine::Notice{ExitStatus::Done, out.str()};
         else
-            line.command = CommandLine::Notice{ExitStatus::Usage, "velmora-log: " + usageError(app, error) +
-                                                                      "\nvelmora-log --help tells more\n"};
+            line.command = CommandLine::Notice{ExitStatus::Usage,
+                                               "velmora-log: " + printableLine(usageError(app, error)) +
+                                                   "\nvelmora-log --help tells more\n"};
         return line;
     }
     if (decodeCommand->parsed())

@@ -66,4 +66,12 @@ void addTechnologyOption(CLI::App& command, std::string& technology, const std::
         ->type_name("NAME");
 }
 
+void addSafe(CLI::App& command, CSVGuard& guard) {
+    command.add_flag_callback(
+        "--safe", [&guard] { guard = CSVGuard::On; },
+        "With csv: put an apostrophe before texts that begin with =, +, -, @ or a control character and are "
+        "no "
+        "number, which spreadsheets would calculate");
+}
+
 } // namespace velmora

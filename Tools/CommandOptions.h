@@ -3,6 +3,8 @@
 
 #pragma once
 
+#include "Tools/Text/CSVText.h"
+
 #include <CLI/CLI.hpp>
 
 #include <functional>
@@ -27,5 +29,8 @@ namespace velmora {
 void addTechnology(CLI::App& command, std::string& technology, const std::string& purpose);
 /// The same with a description of its own, which the names follow.
 void addTechnologyOption(CLI::App& command, std::string& technology, const std::string& description);
+
+/// `--safe`, which turns the guard of CSV's cells on.
+void addSafe(CLI::App& command, CSVGuard& guard);
 
 } // namespace velmora

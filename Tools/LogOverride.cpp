@@ -4,6 +4,7 @@
 #include "Tools/LogOverride.h"
 
 #include "Platform/Console.h"
+#include "Platform/PrintableText.h"
 
 #include <cstdlib>
 
@@ -61,7 +62,7 @@ void DeferredLog::release() {
 
 void ProgressLine::show(std::string_view text) {
     clear();
-    std::fwrite(text.data(), 1, text.size(), stderr);
+    std::fputs(printable(text).c_str(), stderr);
     std::fflush(stderr);
     _shown = true;
 }

@@ -4,6 +4,7 @@
 #include "Tools/Report.h"
 
 #include "Platform/Linux/Termination.h"
+#include "Platform/PrintableText.h"
 #include "Tools/ExitStatus.h"
 
 #include <cinttypes>
@@ -30,7 +31,7 @@ char lastWords[4096];
 
 void report(std::string_view text) {
     std::string line = "velmora-log: ";
-    line += text;
+    line += printableLine(text);
     line += '\n';
     writeToStandardError(line);
 }
@@ -50,8 +51,8 @@ std::string positionInFile(std::string_view title, std::uint64_t number, std::ui
     return place;
 }
 
-WorkContext::WorkContext(std::string title, std::function<void()> cleanUp)
-    : _title(std::move(title)), _cleanUp(std::move(cleanUp)), _earlier(std::exchange(currentContext, this)) {}
+WorkContext::WorkContext(const std::string& title, std::function<void()> cleanUp)
+    : _title(printable(title)), _cleanUp(std::move(cleanUp)), _earlier(std::exchange(currentContext, this)) {}
 
 WorkContext::~WorkContext() {
     currentContext = _earlier;

@@ -28,7 +28,7 @@ class WorkContext {
 public:
     /// `title`: a file, or the service, or empty. `cleanUp` runs before the program ends that way, and before
     /// those of the contexts around this one.
-    explicit WorkContext(std::string title, std::function<void()> cleanUp = {});
+    explicit WorkContext(const std::string& title, std::function<void()> cleanUp = {});
     ~WorkContext();
     WorkContext(const WorkContext&) = delete;
     WorkContext& operator=(const WorkContext&) = delete;

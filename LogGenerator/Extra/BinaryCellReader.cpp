@@ -3,6 +3,8 @@
 
 #include "LogGenerator/Extra/BinaryCellReader.h"
 
+#include "PropertyLists/PropertyList.h"
+
 #include <algorithm>
 
 namespace velmora {
@@ -11,8 +13,10 @@ namespace {
 
 constexpr std::string_view magic = "bplist00";
 constexpr std::size_t trailerLength = 32;
-/// Such a list is well within every limit of the property-list reader.
+/// Such a list is well within every limit of the property-list reader but that of its objects, since a list
+/// can refer to the same one several times.
 constexpr std::size_t maximumLength = std::size_t{1} << 16;
+constexpr std::size_t maximumObjects = messageLimits.maximumObjects;
 constexpr std::size_t maximumTextLength = 64;
 
 class Reader {
@@ -23,10 +27,14 @@ public:
         Object root;
         if (!readTrailer() || !object(_root, root) || root.type != arrayType || !hasReferences(root, 1))
             return false;
+        std::size_t objects = 1 + root.count;
         for (std::size_t i = 0; i < root.count; ++i) {
             Object dictionary;
             if (!object(reference(root, i), dictionary) || dictionary.type != dictionaryType ||
                 !hasReferences(dictionary, 2))
+                return false;
+            objects += 2 * dictionary.count;
+            if (objects > maximumObjects)
                 return false;
             cells.emplace_back();
             for (std::size_t j = 0; j < dictionary.count; ++j)

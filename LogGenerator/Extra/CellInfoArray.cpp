@@ -23,7 +23,8 @@ bool holds(const Dictionary& cell, std::string_view key, std::string_view text) 
 } // namespace
 
 CellInfoArrayReader::CellInfoArrayReader(const Data& record) {
-    if (Result<Value> payload = readPropertyList(record.from(LogMessage::headerLength).bytes()))
+    if (Result<Value> payload =
+            readPropertyList(record.from(LogMessage::headerLength).bytes(), messageLimits))
         _parsed = *std::move(payload);
     else
         logLine(LogPriority::Error, "Cell Info Array data could not be constructed");

@@ -12,7 +12,12 @@ namespace velmora {
 
 namespace {
 
-constexpr std::size_t longestCached = std::size_t{1} << 16;
+/// What is kept: a payload of a few bytes may refer to the same object very often.
+constexpr PropertyListLimits cachedLimits{
+    .maximumObjects = 5'000,
+    .maximumBytes = std::size_t{1} << 16,
+    .maximumMemory = std::size_t{2} << 20,
+};
 
 } // namespace
 
@@ -22,11 +27,11 @@ Result<Value> PayloadCache::read(const Data& record) {
         if (!known.value.isNone() &&
             std::equal(bytes.begin(), bytes.end(), known.bytes.begin(), known.bytes.end()))
             return known.value;
-    Result<Value> payload = readPropertyList(bytes);
-    if (payload && bytes.size() <= longestCached) {
-        _payloads[_next] = {{bytes.begin(), bytes.end()}, *payload};
-        _next = (_next + 1) % _payloads.size();
-    }
+    Result<Value> payload = readPropertyList(bytes, cachedLimits);
+    if (!payload)
+        return readPropertyList(bytes, messageLimits);
+    _payloads[_next] = {{bytes.begin(), bytes.end()}, *payload};
+    _next = (_next + 1) % _payloads.size();
     return payload;
 }
 

@@ -17,7 +17,8 @@ namespace velmora {
 /// repeatedly without having changed, or as before, alternately in both forms: some of them are cached.
 class PayloadCache {
 public:
-    /// What the record's payload holds, as readPropertyList returns it.
+    /// What the record's payload holds, as readPropertyList returns it within the limits of a message. Large
+    /// ones are not cached.
     [[nodiscard]] Result<Value> read(const Data& record);
 
 private:

@@ -60,7 +60,7 @@ void GSMLogGenerator::updateState(Dictionary& state, const Data& data) {
     Observer* const observing = observer();
     if (observing)
         observing->beginMessage();
-    Result<Value> object = readPropertyList(data.bytes());
+    Result<Value> object = readPropertyList(data.bytes(), messageLimits);
     if (!object)
         throw AssertionFailure("Could not deserialize the object", assertionFile, notDeserializedLine);
     Value display = processObject(*object);

@@ -3,9 +3,10 @@
 
 #include "Platform/Linux/StderrLog.h"
 
+#include "Platform/PrintableText.h"
+
 #include <unistd.h>
 
-#include <algorithm>
 #include <cerrno>
 
 namespace velmora {
@@ -13,11 +14,8 @@ namespace velmora {
 StderrLog::StderrLog() : _descriptor(STDERR_FILENO) {}
 
 void StderrLog::write(int priority, std::string_view text) {
-    if (text.ends_with('\n'))
-        text.remove_suffix(1);
     _line = {'<', static_cast<char>('0' + (priority & 7)), '>'};
-    _line += text;
-    std::replace(_line.begin(), _line.end(), '\n', ' ');
+    _line += printableLine(text); // which may say what another program or a file says
     _line += '\n';
 
     std::string_view rest = _line;

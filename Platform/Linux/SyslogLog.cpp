@@ -4,6 +4,7 @@
 #include "Platform/Linux/SyslogLog.h"
 
 #include "Platform/Linux/Files/FileDescriptor.h"
+#include "Platform/PrintableText.h"
 
 #include <sys/socket.h>
 #include <sys/un.h>
@@ -51,8 +52,9 @@ void SyslogLog::write(int priority, std::string_view text) {
         ::syslog(LOG_ERR, "%" PRIu64 " log lines were discarded while there was no %s", discarded,
                  _socket.c_str());
     constexpr std::size_t longest = std::numeric_limits<int>::max();
-    ::syslog(priority & (LOG_PRIMASK | LOG_FACMASK), "%.*s", static_cast<int>(std::min(text.size(), longest)),
-             text.data());
+    const std::string line = printableLine(text); // which may say what another program or a file says
+    ::syslog(priority & (LOG_PRIMASK | LOG_FACMASK), "%.*s", static_cast<int>(std::min(line.size(), longest)),
+             line.data());
 }
 
 bool SyslogLog::isReachable() {

@@ -16,6 +16,13 @@ namespace velmora {
 
 namespace {
 
+/// A history has five refreshes, each with the object of one message and its display, which has no more
+/// values than that; and a few values about each.
+constexpr PropertyListLimits snapshotLimits{
+    .maximumObjects = 11 * messageLimits.maximumObjects,
+    .maximumMemory = std::size_t{512} << 20,
+};
+
 /// How far apart the application's refreshes are.
 constexpr std::chrono::seconds refreshInterval(2);
 
@@ -35,24 +42,13 @@ bool isDisplayTree(const Value& value) {
     return value.asString() != nullptr;
 }
 
-/// XML as far as it goes: the binary form carries every text.
-Result<Data> serialized(const Value& value) {
-    if (const Result<std::string> xml = writeXMLPropertyList(value))
-        return Data(std::vector<std::uint8_t>(xml->begin(), xml->end()));
-    Result<std::vector<std::uint8_t>> binary = writeBinaryPropertyList(value);
-    if (!binary)
-        return Failure{binary.reason()};
-    return Data(*std::move(binary));
-}
-
 Result<Value> readAll(ChunkedInput& input) {
-    const PropertyListLimits limits;
-    if (input.ensure(limits.maximumBytes + 1))
-        return Failure{"property list of more than " + std::to_string(limits.maximumBytes) +
+    if (input.ensure(snapshotLimits.maximumBytes + 1))
+        return Failure{"property list of more than " + std::to_string(snapshotLimits.maximumBytes) +
                        " bytes, wanted a snapshot of at most that"};
     if (input.failure())
         return *input.failure();
-    return readPropertyList(input.available(), limits);
+    return readPropertyList(input.available(), snapshotLimits);
 }
 
 } // namespace
@@ -154,15 +150,16 @@ void SnapshotReader::openObject(const Value& object) {
         addRecordLoss(0, place() + "object that holds other kinds than string, array and dictionary");
         return;
     }
-    Result<Data> message = serialized(object);
-    if (!message) {
-        addRecordLoss(0, place() + message.reason());
-    } else if (message->size() > maximumMessageSize) {
-        addRecordLoss(message->size(), place() + "object of " + std::to_string(message->size()) +
-                                           " bytes, wanted at most " + std::to_string(maximumMessageSize));
+    const Result<std::string> list = writePropertyList(object);
+    if (!list) {
+        addRecordLoss(0, place() + list.reason());
+    } else if (list->size() > maximumMessageSize) {
+        addRecordLoss(list->size(), place() + "object of " + std::to_string(list->size()) +
+                                        " bytes, wanted at most " + std::to_string(maximumMessageSize));
     } else {
         countRecord();
-        _pending = LoggedMessage{_begin, *std::move(message), number(), 0};
+        _pending =
+            LoggedMessage{_begin, Data(std::vector<std::uint8_t>(list->begin(), list->end())), number(), 0};
     }
 }
 

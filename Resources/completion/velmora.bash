@@ -160,12 +160,12 @@ _velmora_log() {
         fi
         return
         ;;
-    decode) options+=(--format --every --samples --wide --max-age --select --from --to --code --warm --technology --strict --jobs) ;;
+    decode) options+=(--format --every --samples --wide --safe --max-age --select --from --to --code --warm --technology --strict --jobs) ;;
     watch) options+=(--once --timeout) ;;
     record) options+=(--force --duration --count --timeout) ;;
     convert) options+=(--force --from --to --code --technology --description --strict) ;;
     info) options+=(--format --technology) ;;
-    fields) options+=(--technology --role --format) ;;
+    fields) options+=(--technology --role --format --safe) ;;
     esac
     if [[ $cur == -* ]]; then
         _velmora_offer "${options[@]}"

@@ -171,20 +171,26 @@ TEST_F(SnapshotFileTest, DecoderWithoutDataYetHoldsAnEmptyArray) {
     EXPECT_THAT(keysOf(list), ElementsAre("Timestamp", "Data", "Description"));
 }
 
-TEST_F(SnapshotFileTest, ValueThatAListCannotCarryIsAFailedWrite) {
+TEST_F(SnapshotFileTest, IsABinaryListWhereXMLCannotCarryAValue) {
     launchAndConnect();
-    // The binary form carries what the XML form cannot.
-    const auto message = writeBinaryPropertyList(dictionary({{"State", "\x01"}, {"Cell", "12"}}));
+    const Value shown = dictionary({{"State", std::string("a\0b\x01\x1B", 5)}, {"Cell \uFFFE", "12"}});
+    const auto message = writeBinaryPropertyList(shown);
     ASSERT_TRUE(message);
     ASSERT_TRUE(platform.ports.deliver(logChannelPortName(), 0, Data::copyOf(*message)));
     platform.queue.advance(2s);
     runUntilIdle();
     open();
     save();
-    EXPECT_THAT(files(), testing::IsEmpty());
-    EXPECT_TRUE(
-        log.contains(LogPriority::Error, "Unable to write snapshot to " + file(startSeconds + 2).string()));
-    EXPECT_TRUE(eventually([] { return isShown("File Error"); }));
+    EXPECT_TRUE(text(startSeconds + 2).starts_with("bplist00"));
+    const Value list = content(startSeconds + 2);
+    EXPECT_THAT(keysOf(list), ElementsAre("Timestamp", "Data", "Description"));
+    const Array* data = (*list.asDictionary())["Data"].asArray();
+    ASSERT_NE(data, nullptr);
+    ASSERT_EQ(data->size(), 1u);
+    EXPECT_EQ((*(*data)[0].asDictionary())["DisplayState"], shown);
+    EXPECT_EQ((*(*data)[0].asDictionary())["Display"], shown);
+    EXPECT_EQ(python("ascii(p['Data'][0]['Display']['State'])", file(startSeconds + 2)),
+              "'a\\x00b\\x01\\x1b'\n");
     EXPECT_EQ(saveScreen(), nullptr);
 }
 

@@ -5,7 +5,9 @@
 
 #include "LogGenerator/GSM/AssertionFailure.h"
 #include "PropertyLists/PropertyList.h"
+#include "Tests/Support/CapturedLog.h"
 #include "Tests/Support/FakeClock.h"
+#include "Tests/Support/Hex.h"
 #include "Tests/Support/RecordedEffects.h"
 
 #include <gmock/gmock.h>
@@ -226,6 +228,28 @@ TEST_F(GSMLogGeneratorTest, UnreadableMessageIsAnAssertionFailure) {
                      "Could not deserialize the object (LogGenerator/GSM/GSMLogGenerator:90)");
     }
     EXPECT_TRUE(state.empty());
+}
+
+TEST_F(GSMLogGeneratorTest, MessageThatMakesTooManyValuesIsUnreadableAndSaysWhy) {
+    // An array of 200 references to an array of 500 references to an empty text: 1 + 200 + 100,000 values.
+    const auto reference = [](std::size_t count, std::uint8_t to) {
+        std::vector<std::uint8_t> array = {0xAF, 0x11, static_cast<std::uint8_t>(count >> 8),
+                                           static_cast<std::uint8_t>(count)};
+        array.resize(array.size() + count, to);
+        return Data(std::move(array));
+    };
+    const Data outer = reference(200, 1);
+    const Data inner = reference(500, 2);
+    // The objects' offsets: 8, 8 + 204, and 504 after that; the table is one after the text.
+    const Data list =
+        joined({hex("62 70 6C 69 73 74 30 30"), outer, inner, hex("50"), hex("0008 00D4 02CC"),
+                hex("000000000000 02 01 0000000000000003"), hex("0000000000000000 00000000000002CD")});
+    const CapturedLog log;
+    EXPECT_THROW(generator.updateState(state, list), AssertionFailure);
+    EXPECT_TRUE(state.empty());
+    EXPECT_EQ(log.textsAt(LogPriority::Error),
+              std::vector<std::string>{
+                  "Malformed message: the list has more than 100000 objects, repeated ones counted"});
 }
 
 TEST_F(GSMLogGeneratorTest, BothAssertionFailuresEndTheProgramWithTheirMessage) {

@@ -171,6 +171,19 @@ TEST_F(LinuxSyslogLog, ASocketWithoutADaemonIsMissing) {
     EXPECT_THAT(syslogCalls, ElementsAre("open velmora with pid as user"));
 }
 
+TEST_F(LinuxStderrLog, WhatOthersSayControlsNoTerminal) {
+    StderrLog log(_near.get());
+    log.write(3, "no port named \x1b]0;title\a\u202Egnp.exe\r\n");
+    EXPECT_THAT(writes(), ElementsAre("<3>no port named \\x1B]0;title\\x07\\u{202E}gnp.exe\\r\n"));
+}
+
+TEST_F(LinuxSyslogLog, WhatOthersSayIsOneLine) {
+    startDaemon();
+    SyslogLog("velmora", _socket).write(3, "no port named a\n<0>forged\x1b[1m\n");
+    EXPECT_THAT(syslogCalls,
+                ElementsAre("open velmora with pid as user", "3 no port named a <0>forged\\x1B[1m", "close"));
+}
+
 using LinuxProgramLog = LinuxSyslogLog;
 
 TEST_F(LinuxProgramLog, TheOptionsChooseTheLogAndTheLevel) {

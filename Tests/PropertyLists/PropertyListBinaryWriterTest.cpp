@@ -74,7 +74,7 @@ TEST(BinaryRoundTrip, GivesTheSameValueAgain) {
                                Value(makeArray()), Value(std::string("\0\x01\x1F", 3))}) {
         const auto list = writeBinaryPropertyList(value);
         ASSERT_TRUE(list) << list.reason();
-        const auto read = readPropertyList(*list);
+        const auto read = readPropertyList(*list, largeLimits);
         ASSERT_TRUE(read) << read.reason();
         EXPECT_TRUE(*read == value);
     }

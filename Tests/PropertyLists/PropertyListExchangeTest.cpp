@@ -155,7 +155,7 @@ TEST_P(PropertyListExchange, WhatIsWrittenThereIsReadHere) {
     ASSERT_TRUE(python("write"));
     std::ifstream file(list(), std::ios::binary);
     const std::vector<std::uint8_t> bytes(std::istreambuf_iterator<char>(file), {});
-    const auto value = readPropertyList(bytes);
+    const auto value = readPropertyList(bytes, largeLimits);
     ASSERT_TRUE(value) << value.reason();
     const auto& [form, name] = GetParam();
     const Value wanted = form == "xml" ? withLineFeeds(sample()) : sample();

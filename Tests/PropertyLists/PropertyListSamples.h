@@ -88,6 +88,10 @@ namespace velmora {
          {"nested", arrayOf({nestedArrays(20), dictionaryOf({{"a", dictionaryOf({{"b", 1}})}})})}});
 }
 
+/// Limits for lists that are larger than a message.
+inline constexpr PropertyListLimits largeLimits{.maximumObjects = 1'000'000,
+                                                .maximumMemory = std::size_t{256} << 20};
+
 /// A list of the size of a large snapshot: thousands of entries with text and data.
 [[nodiscard]] inline Value manyEntries() {
     const auto entries = makeArray();

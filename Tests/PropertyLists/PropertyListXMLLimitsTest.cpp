@@ -23,7 +23,8 @@ TEST(XMLReader, HoldsToItsLimits) {
     EXPECT_EQ(reasonWith(nested, {.maximumDepth = 3}), "read");
     EXPECT_EQ(reasonWith(nested, {.maximumDepth = 2}), "offset 25: <array> is nested deeper than 2");
     EXPECT_EQ(reasonWith(nested, {.maximumObjects = 4}), "read");
-    EXPECT_EQ(reasonWith(nested, {.maximumObjects = 3}), "the list has more than 3 objects");
+    EXPECT_EQ(reasonWith(nested, {.maximumObjects = 3}),
+              "the list has more than 3 objects, repeated ones counted");
     EXPECT_EQ(reasonWith(nested, {.maximumObjects = std::numeric_limits<std::size_t>::max()}), "read");
     EXPECT_EQ(reasonWith("<true/>", {.maximumBytes = 7}), "read");
     EXPECT_EQ(reasonWith("<true/>", {.maximumBytes = 6}), "the list has 7 bytes, more than 6");
@@ -38,7 +39,7 @@ TEST(XMLReader, RefusesAMillionNestedArrays) {
     ASSERT_FALSE(open);
     for (int i = 0; i < 1'000'000; ++i)
         text += "</array>";
-    const auto closed = readText(text);
+    const auto closed = readText(text, {.maximumObjects = 1'000'000});
     ASSERT_FALSE(closed);
     EXPECT_EQ(closed.reason(), "offset 896: <array> is nested deeper than 128");
 }
@@ -57,6 +58,33 @@ TEST(XMLReader, BoundsWhatADocumentOfTagsTakes) {
         ASSERT_FALSE(value);
         EXPECT_EQ(value.reason(), "the list has more tags and attributes than 100 objects need");
     }
+}
+
+TEST(XMLReader, AMessageMakesAtMostAHundredThousandValues) {
+    const auto arrayOfBooleans = [](int count) {
+        std::string text = "<array>";
+        for (int i = 0; i < count; ++i)
+            text += "<true/>";
+        return text + "</array>";
+    };
+    EXPECT_TRUE(readText(arrayOfBooleans(99'999), messageLimits));
+    const auto refused = readText(arrayOfBooleans(100'000), messageLimits);
+    ASSERT_FALSE(refused);
+    EXPECT_EQ(refused.reason(), "the list has more than 100000 objects, repeated ones counted");
+}
+
+TEST(XMLReader, CountsTextAndDataAndKeysTwice) {
+    // Two values and a key of 256 bytes each; the text has 100, the key 3 bytes twice.
+    const std::string text = "<dict><key>key</key><string>" + std::string(100, 'x') + "</string></dict>";
+    EXPECT_TRUE(readText(text, {.maximumMemory = 874}));
+    const auto refused = readText(text, {.maximumMemory = 873});
+    ASSERT_FALSE(refused);
+    EXPECT_EQ(refused.reason(),
+              "the list takes more than 873 bytes of memory, repeated text and data counted");
+    // Four digits are three bytes.
+    const std::string data = "<data>" + std::string(400, 'A') + "</data>";
+    EXPECT_TRUE(readText(data, {.maximumMemory = 556}));
+    EXPECT_FALSE(readText(data, {.maximumMemory = 555}));
 }
 
 TEST(XMLReader, GivesAReasonOrAValueForEveryTruncationAndEveryChangedByte) {

@@ -87,7 +87,7 @@ TEST(XMLRoundTrip, GivesTheSameValueAgain) {
          {everyKind(), manyEntries(), nestedArrays(128), Value("bare"), Value(makeArray())}) {
         const auto xml = writeXMLPropertyList(value);
         ASSERT_TRUE(xml) << xml.reason();
-        const auto read = readPropertyList(bytesOf(*xml));
+        const auto read = readPropertyList(bytesOf(*xml), largeLimits);
         ASSERT_TRUE(read) << read.reason();
         EXPECT_TRUE(*read == value);
     }

@@ -52,6 +52,21 @@ TEST(SnapshotReader, givesTheMessagesOfEachRefresh) {
     }
 }
 
+TEST(SnapshotReader, readsAHistoryOfTheLargestMessages) {
+    // Five entries, each with an object of 100,000 values and its display.
+    std::string array = "<array>";
+    for (int i = 0; i < 99'999; ++i)
+        array += "<string/>";
+    array += "</array>";
+    std::string list = "<dict><key>Timestamp</key><string/><key>Data</key><array>";
+    for (int i = 0; i < 5; ++i)
+        list += "<dict><key>DisplayState</key>" + array + "<key>Display</key>" + array + "</dict>";
+    list += "</array></dict>";
+    const ReadOut out = readAnyForm(Data(std::vector<std::uint8_t>(list.begin(), list.end())));
+    EXPECT_EQ(out.failure, "");
+    EXPECT_EQ(out.messages.size(), 5U);
+}
+
 TEST(SnapshotReader, splitsRawMessagesUnchanged) {
     // With prefixes, a wrong type, and records of the extra stream.
     const Data raw = hex(R"(02 0F00 3271 0000000000000000 010000

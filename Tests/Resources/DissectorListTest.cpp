@@ -21,6 +21,8 @@
 namespace velmora {
 namespace {
 
+using testing::HasSubstr;
+
 /// The keys of a list, and its other texts and integers, in their order.
 struct ListTexts {
     std::string keys;
@@ -95,6 +97,39 @@ TEST(DissectorList, agreesOnEveryListOfTheRecordings) {
     EXPECT_GT(xml, 50);
 }
 
+TEST(DissectorList, escapesWhatWouldDisturbATerminal) {
+    NEEDS_PROGRAM("tshark");
+    const std::string hostile =
+        "a\x1b[1m\u009B\u200F\u202E\u061C\U000E0041\uFEFF e\u0301\u00FC\U0001F4E1\n\t\x7F";
+    const std::string shown =
+        "a\\x1B[1m\\u{9B}\\u{200F}\\u{202E}\\u{61C}\\u{E0041}\\u{FEFF} e\u0301\u00FC\U0001F4E1\\n\\t\\x7F";
+    std::string marks = "e";
+    for (int i = 0; i < 9; ++i)
+        marks += "\u0301";
+    const auto list =
+        writeBinaryPropertyList(std::make_shared<Dictionary>(std::initializer_list<Dictionary::Entry>{
+            {hostile, hostile}, {"marks", marks}, {hostile + "2", std::make_shared<Array>()}}));
+    ASSERT_TRUE(list) << list.reason();
+    const TemporaryDirectory directory;
+    const std::string path = directory / "a.pcapng";
+    writeCapture(path, "IFX", std::vector<Data>{Data(std::vector<std::uint8_t>(*list))});
+    std::string tree;
+    for (const std::string& line : dissected(path, "-O velmora"))
+        tree += line + "\n";
+    EXPECT_THAT(tree, HasSubstr("        " + shown + ": " + shown + "\n"));
+    EXPECT_THAT(tree, HasSubstr("        marks: " + marks.substr(0, 17) + "\\u{301}\n"));
+    EXPECT_THAT(tree, HasSubstr("        " + shown + "2: 0 elements\n"));
+    EXPECT_EQ(tree.find('\x1b'), std::string::npos);
+    // What filters compare is the text itself.
+    EXPECT_EQ(dissected(path, "-Y " + shellQuoted("velmora.plist.value == \"" + marks + "\"")).size(), 1U);
+
+    writeCapture(path, hostile, std::vector<Data>{Data(std::vector<std::uint8_t>(*list))});
+    tree.clear();
+    for (const std::string& line : dissected(path, "-O velmora"))
+        tree += line + "\n";
+    EXPECT_THAT(tree, HasSubstr("Technology: " + shown));
+}
+
 /// A binary list of one object, an offset table of one byte and the trailer.
 Data listOf(const char* object) {
     const Data head = hex("62706C6973743030");
@@ -128,6 +163,10 @@ TEST(DissectorList, showsEachKindOfValueAndMarksErrors) {
         {"text", listOf("53 616263"), "abc", ""},
         {"text of a counted length", listOf("5F 10 03 616263"), "abc", ""},
         {"UTF-16", listOf("61 00FC"), "\xC3\xBC", ""},
+        {"ASCII in UTF-16", listOf("62 0061 0062"), "ab", ""},
+        {"a wide character and a pair", listOf("63 4E2D D83D DCE1"), "\u4E2D\U0001F4E1", ""},
+        {"half a pair", listOf("62 D83D 0061"), "\uFFFDa", ""},
+        {"no ASCII", listOf("52 61FF"), "a\uFFFD", ""},
         {"16 bytes", listOf("14 00000000000000000000000000000001"), "",
          "Property list cannot be read: object of unknown kind 0x14 at 8"},
         {"text past the objects", listOf("54 616263"), "",

@@ -79,7 +79,7 @@ class IncludeCheckTest(unittest.TestCase):
         self.expect_none("PropertyLists/XMLReader.cpp", "<pugixml.hpp>")
         self.expect_problem("Model/Snapshot.cpp", "<pugixml.hpp>", "Model may not include pugixml")
         self.expect_none("Tools/CommandLine.cpp", "<CLI/CLI.hpp>")
-        self.expect_problem("Tools/Text/PrintableText.h", "<utf8proc.h>", "Tools may not include utf8proc")
+        self.expect_problem("Platform/PrintableText.h", "<utf8proc.h>", "Platform may not include utf8proc")
         self.expect_problem("Tools/Text/JSONText.cpp", "<nlohmann/json.hpp>", "Tools may not include nlohmann_json")
         self.expect_problem("Model/Snapshot.cpp", "<boost/any.hpp>", "Model may not include <boost/any.hpp>")
 

@@ -46,6 +46,16 @@ TEST(MeasurementTest, NoTextHasTheHeightOfALine) {
     EXPECT_EQ(sizeOfText("a\nb", Font::systemFontOfSize(15)), sizeOfText("a b", Font::systemFontOfSize(15)));
 }
 
+TEST(MeasurementTest, TextIsShownEscapedWhereItWouldDisturbItsLine) {
+    const std::string hostile = "a\u202Eb\x1b\tc\nd";
+    const char* const shown = "a\\u{202E}b\\x1B\\tc d";
+    Label label(hostile);
+    label.sizeToFit();
+    EXPECT_EQ(label.text(), hostile);
+    EXPECT_EQ(static_cast<LabelWidget*>(label.widget())->shownText(), shown);
+    EXPECT_EQ(sizeOfText(hostile, Font::systemFontOfSize(15)), sizeOfText(shown, Font::systemFontOfSize(15)));
+}
+
 TEST(MeasurementTest, FontsAreInTheSameUnitAsFrames) {
     Label label("x");
     label.setFont(Font::systemFontOfSize(20));

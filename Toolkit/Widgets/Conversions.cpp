@@ -3,6 +3,8 @@
 
 #include "Toolkit/Widgets/Conversions.h"
 
+#include "Platform/PrintableText.h"
+
 #include <algorithm>
 #include <cmath>
 
@@ -14,6 +16,13 @@ QString toQt(std::string_view text) {
 
 std::string fromQt(const QString& text) {
     return text.toStdString();
+}
+
+QString escapedLine(const QString& text) {
+    const bool isPlainText = std::all_of(text.begin(), text.end(), [](QChar character) {
+        return character.unicode() >= 0x20 && character.unicode() < 0x7F;
+    });
+    return isPlainText ? text : toQt(printableLine(fromQt(text)));
 }
 
 QFont toQt(const Font& font) {

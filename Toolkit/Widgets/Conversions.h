@@ -18,6 +18,8 @@
 namespace velmora {
 
 [[nodiscard]] QString toQt(std::string_view text);
+/// A text as widgets of one line show it: line feeds are blanks, and what would disturb the line is escaped.
+[[nodiscard]] QString escapedLine(const QString& text);
 [[nodiscard]] std::string fromQt(const QString& text);
 /// Leaves the family open for the interface font, so that widgets take it from the user's setting.
 [[nodiscard]] QFont toQt(const Font& font);

@@ -31,7 +31,7 @@ BackButton::BackButton(QWidget* parent) : QAbstractButton(parent) {
 }
 
 QSize BackButton::sizeHint() const {
-    const double advance = QFontMetricsF(font()).horizontalAdvance(text());
+    const double advance = QFontMetricsF(font()).horizontalAdvance(escapedLine(text()));
     return {std::max(static_cast<int>(std::ceil(advance)) + chevronWidth + 8, 44), 44};
 }
 
@@ -54,7 +54,7 @@ void BackButton::paintEvent(QPaintEvent* /*event*/) {
     painter.setPen(ink);
     const QRect room = rect().adjusted(chevronWidth, 0, -4, 0);
     painter.drawText(room, static_cast<int>(Qt::AlignLeft | Qt::AlignVCenter) | Qt::TextSingleLine,
-                     QFontMetricsF(font()).elidedText(text(), Qt::ElideRight, room.width()));
+                     QFontMetricsF(font()).elidedText(escapedLine(text()), Qt::ElideRight, room.width()));
     if (hasFocus()) {
         QStyleOptionFocusRect option;
         option.initFrom(this);

@@ -13,14 +13,6 @@
 
 namespace velmora {
 
-namespace {
-
-QString oneLine(QString text) {
-    return text.replace(u'\n', u' ');
-}
-
-} // namespace
-
 LabelWidget::LabelWidget() {
     setTextFormat(Qt::PlainText); // what a modem reports is never markup
     setAlignment(Qt::AlignLeft | Qt::AlignVCenter);
@@ -38,7 +30,7 @@ void LabelWidget::setElideMode(Qt::TextElideMode mode) {
 
 QSize LabelWidget::sizeHint() const {
     const QFontMetricsF metrics(font());
-    return {static_cast<int>(std::ceil(metrics.horizontalAdvance(oneLine(text())))),
+    return {static_cast<int>(std::ceil(metrics.horizontalAdvance(escapedLine(text())))),
             static_cast<int>(std::ceil(metrics.height()))};
 }
 
@@ -48,7 +40,7 @@ QSize LabelWidget::minimumSizeHint() const {
 
 QString LabelWidget::shownText() const {
     const QFontMetricsF metrics(font());
-    const QString whole = oneLine(text());
+    const QString whole = escapedLine(text());
     return metrics.horizontalAdvance(whole) <= width() ? whole
                                                        : metrics.elidedText(whole, _elideMode, width());
 }

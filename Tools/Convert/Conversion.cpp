@@ -200,7 +200,7 @@ Result<bool> toSnapshot(MessageReader& reader, const Conversion& conversion, int
     // Without a refresh there is no time but now.
     const Time timeStamp = saved.tick ? *saved.tick : MachineClock().now();
     const Result<std::string> list =
-        writeXMLPropertyList(makeSnapshot(timeStamp, saved.contents, conversion.description));
+        writePropertyList(makeSnapshot(timeStamp, saved.contents, conversion.description));
     if (!list)
         return Failure{conversion.title + ": cannot be made a snapshot: " + list.reason()};
     const Bytes content(reinterpret_cast<const std::uint8_t*>(list->data()), list->size());

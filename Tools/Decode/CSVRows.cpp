@@ -14,7 +14,7 @@ CSVRows::CSVRows(Output& output, bool isLive, const DecodeOptions& options, cons
         return;
     TextBuffer cell;
     cell.append(',');
-    appendCsvText(cell, file);
+    appendCsvText(cell, file, options.guard);
     _fileCell = cell.view();
 }
 
@@ -41,7 +41,7 @@ std::string CSVRows::header(const DecodeOptions& options) {
         row.append(",technology");
     for (const std::string& name : options.selection.names()) {
         row.append(',');
-        appendCsvText(row, name);
+        appendCsvText(row, name, options.guard);
     }
     row.append(csvRowEnd);
     return std::string(row.view());
@@ -56,7 +56,7 @@ void CSVRows::writeRow(Time moment, const Value& display) {
         if (NodeSelection::hasWildcard(path))
             appendAll(display, path);
         else
-            appendCsvCell(line(), NodeSelection::find(display, path));
+            appendCsvCell(line(), NodeSelection::find(display, path), _options.guard);
     }
     endLine(csvRowEnd);
 }
@@ -74,7 +74,7 @@ void CSVRows::appendAll(const Value& display, const std::string& path) {
             appendJson(_cell, *value);
     }
     if (!_found.empty())
-        appendCsvText(line(), _cell.view());
+        appendCsvText(line(), _cell.view(), _options.guard);
 }
 
 } // namespace velmora

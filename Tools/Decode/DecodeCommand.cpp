@@ -4,6 +4,7 @@
 #include "Tools/Decode/DecodeCommand.h"
 
 #include "Platform/Linux/MachineClock.h"
+#include "Platform/PrintableText.h"
 #include "Recording/OpenMessages.h"
 #include "Tools/Decode/CSVRows.h"
 #include "Tools/Decode/DecodeProgress.h"
@@ -19,7 +20,6 @@
 #include "Tools/LogOverride.h"
 #include "Tools/Output.h"
 #include "Tools/Report.h"
-#include "Tools/Text/PrintableText.h"
 
 #include <algorithm>
 #include <memory>

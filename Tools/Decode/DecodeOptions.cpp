@@ -22,6 +22,8 @@ void checkTogether(const DecodeOptions& options) {
         throw CLI::ValidationError("--max-age",
                                    "got another output, wanted --every refresh with --format jsonl "
                                    "or csv");
+    if (options.guard == CSVGuard::On && options.format != Format::Csv)
+        throw CLI::ValidationError("--safe", "got another format, wanted --format csv");
     if (options.samples != DecodeOptions::Samples::None) {
         const bool isWide = options.samples == DecodeOptions::Samples::Wide;
         if (isWide && options.format != Format::Csv)
@@ -83,6 +85,7 @@ CLI::App* addDecode(CLI::App& app, DecodeOptions& options) {
             "With --samples and csv: a row for each message that reported a selected value, a column for "
             "each selected leaf, a row of its own for each row of a list")
         ->needs(samples);
+    addSafe(*command, options.guard);
     command
         ->add_option_function<double>(
             "--max-age",

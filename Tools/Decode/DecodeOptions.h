@@ -5,6 +5,7 @@
 
 #include "Tools/Decode/Paths/NodeSelection.h"
 #include "Tools/Messages/MessageSelection.h"
+#include "Tools/Text/CSVText.h"
 
 #include <chrono>
 #include <cstddef>
@@ -36,6 +37,7 @@ struct DecodeOptions {
     NodeSelection selection; ///< not empty for Csv without or with wide samples
     /// For JsonLines and Csv at each refresh: older values are left out. Absent for no limit.
     std::optional<std::chrono::nanoseconds> maximumAge;
+    CSVGuard guard = CSVGuard::Off; ///< for Csv alone
     MessageSelection messages;
     std::string technology; ///< overrides the file's, or chooses one of several; empty for the file's
     bool isStrict = false;  ///< a message that ends the application ends decoding as well

@@ -3,6 +3,7 @@
 
 #include "Tools/Decode/DecodeWriter.h"
 
+#include "Platform/PrintableText.h"
 #include "Tools/Decode/CSVRows.h"
 #include "Tools/Decode/FinalDisplay.h"
 #include "Tools/Decode/JSONLines.h"
@@ -11,7 +12,6 @@
 #include "Tools/Decode/Samples/WideRows.h"
 #include "Tools/Output.h"
 #include "Tools/Report.h"
-#include "Tools/Text/PrintableText.h"
 
 #include <string>
 

@@ -7,7 +7,6 @@
 #include "Tools/Fields/SourceNumber.h"
 #include "Tools/Fields/SourceText.h"
 #include "Tools/Output.h"
-#include "Tools/Text/CSVText.h"
 
 #include <algorithm>
 #include <string>
@@ -102,30 +101,30 @@ std::string textOf(const SourceColumn& column, const Leaf& leaf) {
     return std::all_of(texts.begin(), texts.end(), isEmpty) ? std::string() : joinedText(texts, separator);
 }
 
-void appendCell(TextBuffer& line, std::string_view text) {
-    line.append(',');
-    if (!text.empty())
-        appendCsvText(line, text);
-}
-
 } // namespace
+
+void CSVFields::appendCell(std::string_view text) {
+    _line.append(',');
+    if (!text.empty())
+        appendCsvText(_line, text, _guard);
+}
 
 void CSVFields::begin() {
     _line.append("technology");
     for (const LeafColumn& column : leafColumns)
-        appendCell(_line, column.name);
+        appendCell(column.name);
     for (const SourceColumn& column : sourceColumns)
-        appendCell(_line, column.name);
+        appendCell(column.name);
     endLine();
 }
 
 void CSVFields::write(std::string_view technology, const CatalogueRows& rows) {
     for (const Leaf& leaf : rows) {
-        appendCsvText(_line, technology);
+        appendCsvText(_line, technology, _guard);
         for (const LeafColumn& column : leafColumns)
-            appendCell(_line, column.text(leaf));
+            appendCell(column.text(leaf));
         for (const SourceColumn& column : sourceColumns)
-            appendCell(_line, textOf(column, leaf));
+            appendCell(textOf(column, leaf));
         endLine();
     }
 }

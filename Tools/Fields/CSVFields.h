@@ -4,6 +4,7 @@
 #pragma once
 
 #include "Tools/Fields/FieldsWriter.h"
+#include "Tools/Text/CSVText.h"
 #include "Tools/Text/TextBuffer.h"
 
 namespace velmora {
@@ -14,15 +15,17 @@ class Output;
 /// each, in their order, with semicolons between; a cell that would have nothing but the semicolons is empty.
 class CSVFields final : public FieldsWriter {
 public:
-    explicit CSVFields(Output& output) : _output(output) {}
+    explicit CSVFields(Output& output, CSVGuard guard = CSVGuard::Off) : _output(output), _guard(guard) {}
 
     void begin() override;
     void write(std::string_view technology, const CatalogueRows& rows) override;
 
 private:
+    void appendCell(std::string_view text);
     void endLine();
 
     Output& _output;
+    CSVGuard _guard;
     TextBuffer _line;
 };
 

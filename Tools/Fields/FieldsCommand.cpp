@@ -21,10 +21,10 @@ namespace velmora {
 
 namespace {
 
-std::unique_ptr<FieldsWriter> makeWriter(FieldsOptions::Format format, Output& output) {
-    switch (format) {
+std::unique_ptr<FieldsWriter> makeWriter(const FieldsOptions& options, Output& output) {
+    switch (options.format) {
     case FieldsOptions::Format::Json: return std::make_unique<JSONFields>(output);
-    case FieldsOptions::Format::Csv: return std::make_unique<CSVFields>(output);
+    case FieldsOptions::Format::Csv: return std::make_unique<CSVFields>(output, options.guard);
     case FieldsOptions::Format::Text: break;
     }
     return std::make_unique<TextFields>(output);
@@ -63,7 +63,7 @@ int runFields(const FieldsOptions& options, Output& output) {
         technologies.assign(voxTechnologies.begin(), voxTechnologies.end());
     else
         technologies.push_back(options.technology);
-    const std::unique_ptr<FieldsWriter> writer = makeWriter(options.format, output);
+    const std::unique_ptr<FieldsWriter> writer = makeWriter(options, output);
     bool complete = true;
     writer->begin();
     for (const std::string& technology : technologies)

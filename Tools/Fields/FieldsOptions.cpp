@@ -53,6 +53,11 @@ CLI::App* addFields(CLI::App& app, FieldsOptions& options) {
             "with all that is known of each; csv: the same, a row each")
         ->check(oneOf({"text", "json", "csv"}))
         ->type_name("text|json|csv");
+    addSafe(*command, options.guard);
+    command->callback([&options] {
+        if (options.guard == CSVGuard::On && options.format != FieldsOptions::Format::Csv)
+            throw CLI::ValidationError("--safe", "got another format, wanted --format csv");
+    });
     command->footer("A * in a path stands for each row of a list. The json conforms to\n"
                     "velmora-log-fields.schema.json.\n\n"
                     "Examples:\n"

@@ -4,6 +4,7 @@
 #pragma once
 
 #include "Tools/Fields/RoleSelection.h"
+#include "Tools/Text/CSVText.h"
 
 #include <cstdint>
 #include <string>
@@ -21,6 +22,7 @@ struct FieldsOptions {
     Format format = Format::Text;
     std::string technology; ///< empty for all
     RoleSelection roles;
+    CSVGuard guard = CSVGuard::Off; ///< for Csv alone
 };
 
 /// Adds the command with its options, help and examples. Parsing fills `options`, which must outlive `app`.

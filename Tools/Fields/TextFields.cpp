@@ -4,9 +4,9 @@
 #include "Tools/Fields/TextFields.h"
 
 #include "LogGenerator/Fields/Role.h"
+#include "Platform/PrintableText.h"
 #include "Tools/Fields/SourceText.h"
 #include "Tools/Output.h"
-#include "Tools/Text/PrintableText.h"
 
 #include <algorithm>
 #include <array>

@@ -3,6 +3,7 @@
 
 #include "Tools/Info/InfoCommand.h"
 
+#include "Platform/PrintableText.h"
 #include "Recording/OpenMessages.h"
 #include "Tools/Decode/Decoding.h"
 #include "Tools/ExitStatus.h"
@@ -11,7 +12,6 @@
 #include "Tools/Info/InfoText.h"
 #include "Tools/Output.h"
 #include "Tools/Report.h"
-#include "Tools/Text/PrintableText.h"
 
 #include <cstddef>
 #include <memory>

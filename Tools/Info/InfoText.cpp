@@ -4,7 +4,7 @@
 #include "Tools/Info/InfoText.h"
 
 #include "Platform/DateText.h"
-#include "Tools/Text/PrintableText.h"
+#include "Platform/PrintableText.h"
 
 #include <chrono>
 #include <cinttypes>
@@ -69,7 +69,7 @@ std::string lossLines(const MessageReader& reader) {
     text += "\n";
     for (const Loss& loss : reader.losses())
         text += "  record " + std::to_string(loss.recordNumber) + " at offset " +
-                std::to_string(loss.offset) + ": " + loss.reason + "\n";
+                std::to_string(loss.offset) + ": " + printable(loss.reason) + "\n";
     if (totals.losses > reader.losses().size())
         text += "  and " + std::to_string(totals.losses - reader.losses().size()) + " more\n";
     return text;

@@ -2,9 +2,12 @@
 // SPDX-License-Identifier: MIT
 
 #include "Platform/Console.h"
+#include "Platform/PrintableText.h"
+#include "Platform/UTF8.h"
 #include "Tools/ListSections/TechnologyTable.h"
 
 #include <cstdio>
+#include <functional>
 #include <iomanip>
 #include <iostream>
 #include <sstream>
@@ -89,6 +92,37 @@ std::string dissectorRecords(const Tables& tables) {
     return text.str();
 }
 
+/// The first and the last of each run of such characters, in ascending order.
+std::string rangesOf(const std::function<bool(CharacterKind)>& isWanted) {
+    constexpr char32_t first = 0x20; // the rest needs no table
+    constexpr char32_t last = 0x10FFFF;
+    std::ostringstream text;
+    text << std::hex;
+    const auto isOfKind = [&isWanted](char32_t character) {
+        return isUnicodeScalar(character) && isWanted(kindOf(character));
+    };
+    int ranges = 0;
+    for (char32_t character = first; character <= last; ++character) {
+        if (!isOfKind(character))
+            continue;
+        text << (ranges++ % 6 == 0 ? "\n        " : " ") << "0x" << static_cast<unsigned>(character);
+        while (character < last && isOfKind(character + 1))
+            ++character;
+        text << ", 0x" << static_cast<unsigned>(character) << ',';
+    }
+    return text.str();
+}
+
+/// The fields of the Lua table that gives the characters that are not shown as they are.
+std::string dissectorCharacters() {
+    const auto isEscaped = [](CharacterKind kind) {
+        return kind == CharacterKind::Control || kind == CharacterKind::Hidden;
+    };
+    const auto isMark = [](CharacterKind kind) { return kind == CharacterKind::Mark; };
+    return "    escaped = {" + rangesOf(isEscaped) + "\n    },\n    marks = {" + rangesOf(isMark) +
+           "\n    },\n";
+}
+
 /// Copies the dissector's template, with the tables in place of the lines that name them. Whether each was
 /// named once.
 bool writeDissector(const Tables& tables, std::istream& source, std::ostream& dissector) {
@@ -101,6 +135,8 @@ bool writeDissector(const Tables& tables, std::istream& source, std::ostream& di
         } else if (line == "@RECORDS@") {
             ++records;
             dissector << dissectorRecords(tables);
+        } else if (line == "@CHARACTERS@") {
+            dissector << dissectorCharacters();
         } else {
             dissector << line << '\n';
         }

@@ -3,9 +3,9 @@
 
 #include "Tools/Messages/TechnologyChoice.h"
 
+#include "Platform/PrintableText.h"
 #include "Platform/TelephonyService.h"
 #include "Tools/Technologies.h"
-#include "Tools/Text/PrintableText.h"
 
 #include <algorithm>
 

@@ -7,6 +7,8 @@
 #include "Tools/Text/JSONText.h"
 
 #include <algorithm>
+#include <charconv>
+#include <system_error>
 
 namespace velmora {
 
@@ -18,9 +20,27 @@ bool isPlain(char character) {
     return byte >= 0x20 && byte < 0x7F && byte != '"' && byte != ',';
 }
 
-void appendQuoted(TextBuffer& out, std::string_view text) {
+/// A decimal number, with or without sign and exponent, and nothing else.
+bool isNumber(std::string_view text) {
+    if (text.starts_with('+') || text.starts_with('-'))
+        text.remove_prefix(1);
+    if (text.empty() || !((text[0] >= '0' && text[0] <= '9') || text[0] == '.'))
+        return false; // a second sign, or a word such as "inf"
+    double number = 0;
+    const char* const end = text.data() + text.size();
+    const auto [parsed, error] = std::from_chars(text.data(), end, number);
+    return parsed == end && error != std::errc::invalid_argument;
+}
+
+bool isFormula(std::string_view text) {
+    constexpr std::string_view beginnings = "=+-@\t\r\n";
+    return !text.empty() && beginnings.find(text[0]) != beginnings.npos && !isNumber(text);
+}
+
+void appendQuoted(TextBuffer& out, std::string_view text, std::string_view before) {
     constexpr std::string_view replacementCharacter = "\xEF\xBF\xBD"; // U+FFFD
     out.append('"');
+    out.append(before);
     for (std::size_t offset = 0; offset < text.size();) {
         const std::size_t begin = offset;
         if (text[offset] == '"') {
@@ -38,23 +58,26 @@ void appendQuoted(TextBuffer& out, std::string_view text) {
 
 } // namespace
 
-void appendCsvText(TextBuffer& out, std::string_view text) {
-    if (!text.empty() && std::all_of(text.begin(), text.end(), isPlain))
+void appendCsvText(TextBuffer& out, std::string_view text, CSVGuard guard) {
+    const std::string_view before = guard == CSVGuard::On && isFormula(text) ? "'" : "";
+    if (!text.empty() && std::all_of(text.begin(), text.end(), isPlain)) {
+        out.append(before);
         out.append(text);
-    else
-        appendQuoted(out, text);
+    } else {
+        appendQuoted(out, text, before);
+    }
 }
 
-void appendCsvCell(TextBuffer& out, const Value* value) {
+void appendCsvCell(TextBuffer& out, const Value* value, CSVGuard guard) {
     if (!value || value->isNone())
         return;
     if (const std::string* text = value->asString()) {
-        appendCsvText(out, *text);
+        appendCsvText(out, *text, guard);
         return;
     }
     TextBuffer json;
     appendJson(json, *value);
-    appendCsvText(out, json.view());
+    appendCsvText(out, json.view(), guard);
 }
 
 } // namespace velmora

@@ -5,12 +5,14 @@
 
 #include "Platform/Base64.h"
 #include "Platform/DateText.h"
+#include "Platform/PrintableText.h"
 #include "Platform/UTF8.h"
 
 #include <array>
 #include <charconv>
 #include <cmath>
 #include <cstdint>
+#include <cstdio>
 #include <cstring>
 #include <optional>
 #include <string>
@@ -92,6 +94,18 @@ void appendEscape(TextBuffer& out, char character) {
     out.append(std::string_view(escape, sizeof escape));
 }
 
+/// As JSON has it: one or two units of UTF-16.
+void appendEscapedCharacter(TextBuffer& out, char32_t character) {
+    char text[16];
+    if (character < 0x10000)
+        std::snprintf(text, sizeof text, "\\u%04x", static_cast<unsigned>(character));
+    else
+        std::snprintf(text, sizeof text, "\\u%04x\\u%04x",
+                      static_cast<unsigned>(0xD800 + ((character - 0x10000) >> 10)),
+                      static_cast<unsigned>(0xDC00 + (character & 0x3FF)));
+    out.append(std::string_view(text));
+}
+
 void appendUnusual(TextBuffer& out, std::string_view text) {
     for (std::size_t offset = 0; offset < text.size();) {
         const auto byte = static_cast<unsigned char>(text[offset]);
@@ -100,8 +114,12 @@ void appendUnusual(TextBuffer& out, std::string_view text) {
             out.append(text[offset++]);
         } else if (byte < 0x80) {
             appendEscape(out, text[offset++]);
-        } else if (nextCharacter(text, offset)) {
-            out.append(text.substr(begin, offset - begin));
+        } else if (const auto character = nextCharacter(text, offset)) {
+            // The same to a reader; as it is it would control a terminal, or hide there.
+            if (kindOf(*character) == CharacterKind::Control)
+                appendEscapedCharacter(out, *character);
+            else
+                out.append(text.substr(begin, offset - begin));
         } else {
             ++offset;
             out.append(replacementCharacter);

@@ -3,7 +3,7 @@
 
 #include "Tools/Text/TreeText.h"
 
-#include "Tools/Text/PrintableText.h"
+#include "Platform/PrintableText.h"
 
 #include <algorithm>
 

@@ -3,7 +3,7 @@
 
 #include "Tools/Watch/TerminalFrame.h"
 
-#include "Tools/Text/PrintableText.h"
+#include "Platform/PrintableText.h"
 
 #include <algorithm>
 

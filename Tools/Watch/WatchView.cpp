@@ -3,8 +3,8 @@
 
 #include "Tools/Watch/WatchView.h"
 
+#include "Platform/PrintableText.h"
 #include "Tools/Report.h"
-#include "Tools/Text/PrintableText.h"
 
 #include <utility>
 

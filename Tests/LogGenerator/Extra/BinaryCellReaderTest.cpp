@@ -108,6 +108,29 @@ INSTANTIATE_TEST_SUITE_P(
                     ValueCase{"LongLengthCutOff", "5F 11 00", "left"}),
     [](const auto& test) { return std::string(test.param.odd); });
 
+/// So many references, of two bytes each, to one dictionary of 250 entries, all of the same key and number.
+Data sharedCells(std::size_t references) {
+    constexpr std::size_t entries = 250;
+    Data array = joined(hex("AF 11"), bigEndian(references, 2));
+    for (std::size_t i = 0; i < references; ++i)
+        array = joined(array, bigEndian(1, 2));
+    Data dictionary = hex("DF 10 FA");
+    for (std::size_t i = 0; i < 2 * entries; ++i)
+        dictionary = joined(dictionary, bigEndian(i < entries ? 2 : 3, 2));
+    return listOf({array, dictionary, mcc, hex("10 07")}, {.offsetWidth = 2, .referenceWidth = 2});
+}
+
+TEST(BinaryCellReaderTest, CountsWhatIsReferredToSeveralTimes) {
+    // The array, and 501 for each dictionary: 199 make 99,700 objects, 200 make 100,201.
+    std::vector<Cell> cells;
+    EXPECT_TRUE(readBinaryCells(sharedCells(199).bytes(), cells));
+    EXPECT_EQ(cells.size(), 199U);
+    cells.clear();
+    EXPECT_FALSE(readBinaryCells(sharedCells(200).bytes(), cells));
+    EXPECT_TRUE(readPropertyList(sharedCells(199).bytes(), messageLimits));
+    EXPECT_FALSE(readPropertyList(sharedCells(200).bytes(), messageLimits));
+}
+
 TEST(BinaryCellReaderTest, TakesTextsOfUpTo64Characters) {
     const auto withText = [](std::size_t length) {
         return listOf({oneCell, oneEntry, mcc, textObject(std::string(length, 'x'))});

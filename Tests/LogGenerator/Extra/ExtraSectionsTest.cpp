@@ -230,9 +230,12 @@ TEST(CellInfoArrayReaderTest, MillionNestedArraysAreALineInTheLog) {
     const CapturedLog log;
     const Data message = joined(hex("FF 00 00 01 00 00 00 00 00 00 00 00 00"), nestedXML());
     EXPECT_EQ(CellInfoArrayReader(message).cells(), nullptr);
-    EXPECT_THAT(log.lines(),
-                ElementsAre(Line{LogPriority::Error, "Cell Info Array data could not be constructed"},
-                            Line{LogPriority::Error, "Failed to get Cell Array\n"}));
+    EXPECT_THAT(
+        log.lines(),
+        ElementsAre(Line{LogPriority::Error, "Malformed message: the list has more tags and attributes "
+                                             "than 100000 objects need"},
+                    Line{LogPriority::Error, "Cell Info Array data could not be constructed"},
+                    Line{LogPriority::Error, "Failed to get Cell Array\n"}));
 }
 
 struct Number {

@@ -60,6 +60,25 @@ TEST_F(ConvertCommandTest, DescriptionIsTheUsers) {
     EXPECT_EQ((*snapshot("out/drive.velmora").asDictionary())["Description"], Value("gate <4>"));
 }
 
+TEST_F(ConvertCommandTest, SnapshotIsABinaryListWhereXMLCannotCarryAValue) {
+    using namespace std::string_literals;
+    const Value display(std::make_shared<Dictionary>(
+        std::initializer_list<Dictionary::Entry>{{"a\0b"s, "\0\x1B\uFFFF"s}, {"c", "plain"}}));
+    const auto message = writeBinaryPropertyList(display);
+    ASSERT_TRUE(message) << message.reason();
+    const Data sent = Data(std::vector<std::uint8_t>(*message));
+    writeRecording("i.pcapng", "IFX", {{at(0), sent}});
+    EXPECT_EQ(convert({path("i.pcapng"), path("out/i.velmora")}, 0), "");
+    EXPECT_EQ(contentOf("out/i.velmora").substr(0, 8), "bplist00");
+    const Value list = snapshot("out/i.velmora");
+    ASSERT_NE(list.asDictionary(), nullptr);
+    const Array& data = *(*list.asDictionary())["Data"].asArray();
+    EXPECT_EQ((*data[0].asDictionary())["Display"], display);
+    EXPECT_THAT(messagesOf("out/i.velmora"), ElementsAre(sent)) << "the same bytes";
+    EXPECT_EQ(convert({path("out/i.velmora"), path("out/again.pcapng")}, 0), "");
+    EXPECT_THAT(messagesOf("out/again.pcapng"), ElementsAre(sent));
+}
+
 TEST_F(ConvertCommandTest, DLFLogHasTheRecordsWithoutTheirTypes) {
     EXPECT_EQ(convert({path("drive.pcapng"), path("out/drive.dlf")}, 0), "");
     const std::string log = contentOf("out/drive.dlf");

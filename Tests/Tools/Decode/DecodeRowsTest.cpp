@@ -43,5 +43,27 @@ TEST_F(DecodeRowsTest, CsvMayHaveARowForEachMessage) {
               "2026-11-16T05:00:02.000000000Z,RR_IDLE\r\n");
 }
 
+TEST_F(DecodeRowsTest, SafeCsvHasNoFormulasInAnyOfItsForms) {
+    const Value message(std::make_shared<Dictionary>(
+        std::initializer_list<Dictionary::Entry>{{"A", "=1+1"}, {"B", "-71"}, {"=C", "@SUM"}}));
+    writeRecording("i.pcapng", "IFX", {{at(0), serialized(message)}});
+    const std::string file = path("i.pcapng");
+    EXPECT_EQ(decode({"--safe", "--format", "csv", "--select", "=a=/A", "--select", "/B", "--select",
+                      "all=/*", file}),
+              "time,'=a,/B,all\r\n"
+              "2026-11-16T05:00:02.000000000Z,'=1+1,-71,'=1+1; -71; @SUM\r\n");
+    EXPECT_EQ(decode({"--format", "csv", "--select", "/A", file}),
+              "time,/A\r\n2026-11-16T05:00:02.000000000Z,=1+1\r\n");
+    EXPECT_EQ(
+        decode({"--safe", "--samples", "--format", "csv", "--select", "=a=/A", "--select", "/=C", file}),
+        "time,modem_time,path,row,value,unit,text,code,record\r\n"
+        "2026-11-16T05:00:00.000000000Z,,'=a,,'=1+1,,'=1+1,,1\r\n"
+        "2026-11-16T05:00:00.000000000Z,,/=C,,'@SUM,,'@SUM,,1\r\n");
+    EXPECT_EQ(decode({"--safe", "--samples", "--wide", "--format", "csv", "--select", "=a=/A", "--select",
+                      "/=C", file}),
+              "time,modem_time,code,record,row,'=a,/=C\r\n"
+              "2026-11-16T05:00:00.000000000Z,,,1,,'=1+1,'@SUM\r\n");
+}
+
 } // namespace
 } // namespace velmora

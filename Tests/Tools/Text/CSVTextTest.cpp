@@ -47,5 +47,46 @@ TEST(CSVTextTest, CellsAreValidForAnyContent) {
     EXPECT_EQ(out.view(), "");
 }
 
+TEST(CSVTextTest, GuardedTextsAreNoFormulas) {
+    struct Case {
+        const char* text;
+        const char* cell;
+    };
+    const Case cases[] = {
+        {"=1+1", "'=1+1"},
+        {"+HYPERLINK", "'+HYPERLINK"},
+        {"-71 dBm", "'-71 dBm"},
+        {"-", "'-"},
+        {"--1", "'--1"},
+        {"-inf", "'-inf"},
+        {"-0x10", "'-0x10"},
+        {"+1 2", "'+1 2"},
+        {"@SUM(A1)", "'@SUM(A1)"},
+        {"=a,b", "\"'=a,b\""},
+        {"=\"a\"", "\"'=\"\"a\"\"\""},
+        {"\t=1", "\"'\t=1\""},
+        {"\r=1", "\"'\r=1\""},
+        {"\n=1", "\"'\n=1\""},
+        {"-71", "-71"},
+        {"+5", "+5"},
+        {"-.5e-3", "-.5e-3"},
+        {"-1e999", "-1e999"}, // out of range, but written as a number
+        {"a=b", "a=b"},
+        {"'=1", "'=1"},
+        {"", "\"\""},
+    };
+    for (const Case& row : cases) {
+        TextBuffer out;
+        appendCsvText(out, row.text, CSVGuard::On);
+        EXPECT_EQ(out.view(), row.cell);
+    }
+    TextBuffer out;
+    const Value formula("=1+1");
+    appendCsvCell(out, &formula, CSVGuard::On);
+    out.append(' ');
+    appendCsvCell(out, &formula);
+    EXPECT_EQ(out.view(), "'=1+1 =1+1");
+}
+
 } // namespace
 } // namespace velmora

@@ -61,6 +61,14 @@ TEST(JSONTextTest, EveryKindHasItsForm) {
         EXPECT_EQ(jsonText(row.value), row.text);
 }
 
+TEST(JSONTextTest, CharactersThatWouldDisturbATerminalAreEscaped) {
+    const std::string text = "\u009B2J\u202E\u061C\uFEFF\U000E0041\U000E0001 \u1719\u00FC\u0301\U0001F4E1";
+    const std::string json = jsonString(text);
+    EXPECT_EQ(json,
+              "\"\\u009b2J\\u202e\\u061c\\ufeff\\udb40\\udc41\\udb40\\udc01 \u1719\u00FC\u0301\U0001F4E1\"");
+    EXPECT_EQ(nlohmann::json::parse(json).get<std::string>(), text);
+}
+
 TEST(JSONTextTest, ContainersAreIndentedAndKeepTheirOrder) {
     const ArrayRef rows = std::make_shared<Array>(std::initializer_list<Value>{"first", 2, makeArray()});
     const DictionaryRef display = makeDictionary();

@@ -4,7 +4,6 @@
 #include "Tools/Decode/Samples/LeafTexts.h"
 
 #include "Tools/Decode/Samples/SampleText.h"
-#include "Tools/Text/CSVText.h"
 #include "Tools/Text/JSONText.h"
 
 namespace velmora {
@@ -30,7 +29,7 @@ LeafTexts::Pieces LeafTexts::piecesOf(const CatalogueField& leaf, std::size_t pa
     TextBuffer text;
     Pieces pieces;
     if (_form == Form::CSV && isNamed) {
-        appendCsvText(text, _selection.names()[path]);
+        appendCsvText(text, _selection.names()[path], _guard);
         pieces.emplace_back(text.view());
         return pieces;
     }
@@ -45,7 +44,7 @@ LeafTexts::Pieces LeafTexts::piecesOf(const CatalogueField& leaf, std::size_t pa
         text.clear();
         appendJsonString(text, leaf.path);
     } else {
-        appendCsvText(text, leaf.path);
+        appendCsvText(text, leaf.path, _guard);
     }
     // A row's number needs no quoting, so that the path is quoted once.
     std::string_view rest = text.view();

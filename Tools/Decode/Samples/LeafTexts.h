@@ -5,6 +5,7 @@
 
 #include "LogGenerator/Observations/Observation.h"
 #include "Tools/Decode/Paths/NodeSelection.h"
+#include "Tools/Text/CSVText.h"
 #include "Tools/Text/TextBuffer.h"
 
 #include <cstddef>
@@ -21,7 +22,8 @@ public:
     enum class Form : std::uint8_t { CSV, JSON };
 
     /// `selection` must outlive it.
-    LeafTexts(const NodeSelection& selection, Form form) : _selection(selection), _form(form) {}
+    LeafTexts(const NodeSelection& selection, Form form, CSVGuard guard)
+        : _selection(selection), _form(form), _guard(guard) {}
 
     /// Appends the cell or, after a comma, the members. `path`: which one of the selection selects it.
     void append(TextBuffer& out, const Observation& observation, std::size_t path);
@@ -33,6 +35,7 @@ private:
 
     const NodeSelection& _selection;
     Form _form;
+    CSVGuard _guard;
     std::vector<std::vector<Pieces>> _pieces; ///< by leaf and path
 };
 

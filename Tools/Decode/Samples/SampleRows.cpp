@@ -9,7 +9,8 @@
 namespace velmora {
 
 SampleRows::SampleRows(Output& output, bool isLive, const DecodeOptions& options, const std::string& file)
-    : SampleWriter(output, isLive, options, LeafTexts::Form::CSV), _fileCell(csvCellOfFile(file)) {}
+    : SampleWriter(output, isLive, options, LeafTexts::Form::CSV),
+      _fileCell(csvCellOfFile(file, options.guard)) {}
 
 std::string SampleRows::header(const DecodeOptions& options) {
     return csvBeginning(options) + ",modem_time,path,row,value,unit,text,code,record" +
@@ -48,14 +49,14 @@ void SampleRows::write(const ObservedMessage& message) {
         technology().leaves.append(line(), observation, choice->path);
         line().append(',');
         if (!observation.rowKey.empty())
-            appendCsvText(line(), observation.rowKey);
+            appendCsvText(line(), observation.rowKey, options().guard);
         line().append(',');
-        appendCsvValue(line(), observation);
+        appendCsvValue(line(), observation, options().guard);
         line().append(',');
         if (observation.kind == ObservedKind::Number)
             line().append(nameOf(observation.leaf->unit));
         line().append(',');
-        appendCsvText(line(), _text.of(observation));
+        appendCsvText(line(), _text.of(observation), options().guard);
         endLine(_tail.view());
     }
 }

@@ -36,12 +36,12 @@ void appendNumber(TextBuffer& out, std::uint64_t number) {
     append(out, number, 10);
 }
 
-void appendCsvValue(TextBuffer& out, const Observation& observation) {
+void appendCsvValue(TextBuffer& out, const Observation& observation, CSVGuard guard) {
     switch (observation.kind) {
     case ObservedKind::Number: appendNumber(out, observation.number); break;
     case ObservedKind::Enumeration: append(out, observation.raw, 10); break;
     case ObservedKind::Flag: out.append(observation.raw != 0 ? "true" : "false"); break;
-    case ObservedKind::Text: appendCsvText(out, observation.words); break;
+    case ObservedKind::Text: appendCsvText(out, observation.words, guard); break;
     case ObservedKind::Binary: appendHexadecimal(out, observation.bytes); break;
     case ObservedKind::Absent: break;
     }
@@ -60,12 +60,12 @@ std::string csvBeginning(const DecodeOptions& options) {
            (options.hasTechnologyColumn ? ",technology" : "");
 }
 
-std::string csvCellOfFile(const std::string& file) {
+std::string csvCellOfFile(const std::string& file, CSVGuard guard) {
     if (file.empty())
         return {};
     TextBuffer cell;
     cell.append(',');
-    appendCsvText(cell, file);
+    appendCsvText(cell, file, guard);
     return std::string(cell.view());
 }
 

@@ -15,7 +15,7 @@ void SampleWriter::didMakeDecoder(LogGenerator& decoder) {
 }
 
 void SampleWriter::willConcern(const Decoded& decoded) {
-    const auto entry = _technologies.try_emplace(decoded.technology, _options.selection, _form).first;
+    const auto entry = _technologies.try_emplace(decoded.technology, _options, _form).first;
     _technology = &entry->second;
     _technology->text = textOf(decoded);
 }

@@ -33,8 +33,8 @@ public:
 protected:
     /// What is kept of a technology of the file: leaves have their numbers in its catalogue alone.
     struct Technology {
-        explicit Technology(const NodeSelection& selection, LeafTexts::Form form)
-            : selected(selection), leaves(selection, form) {}
+        Technology(const DecodeOptions& options, LeafTexts::Form form)
+            : selected(options.selection), leaves(options.selection, form, options.guard) {}
 
         std::string text; ///< the technology, as lines show it; empty where they do not
         SelectedLeaves selected;

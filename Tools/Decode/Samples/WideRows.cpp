@@ -24,7 +24,7 @@ bool areSameRow(const Observation& a, const Observation& b) {
 WideRows::WideRows(Output& output, bool isLive, const DecodeOptions& options, const std::string& file,
                    SampleColumns& columns)
     : SampleWriter(output, isLive, options, LeafTexts::Form::CSV), _columns(columns),
-      _fileCell(csvCellOfFile(file)) {}
+      _fileCell(csvCellOfFile(file, options.guard)) {}
 
 std::string WideRows::header(const DecodeOptions& options, const SampleColumns& columns) {
     TextBuffer row;
@@ -34,7 +34,7 @@ std::string WideRows::header(const DecodeOptions& options, const SampleColumns& 
         row.append(",row");
     for (const SampleColumns::Column& column : columns.columns()) {
         row.append(',');
-        appendCsvText(row, column.title);
+        appendCsvText(row, column.title, options.guard);
     }
     row.append(csvRowEnd);
     return std::string(row.view());
@@ -95,14 +95,14 @@ void WideRows::writeRow(const ObservedMessage& message, const Observation& first
     if (_columns.hasRows()) {
         line().append(',');
         if (!first.rowKey.empty())
-            appendCsvText(line(), first.rowKey);
+            appendCsvText(line(), first.rowKey, options().guard);
         else if (!first.rows.empty())
             appendNumber(line(), std::uint64_t{first.rows.back()});
     }
     for (const Observation*& cell : _cells) {
         line().append(',');
         if (cell)
-            appendCsvValue(line(), *cell);
+            appendCsvValue(line(), *cell, options().guard);
         cell = nullptr;
     }
     endLine(csvRowEnd);
