@@ -28,18 +28,20 @@ private:
     std::string _name;
 };
 
-void logFailure(const std::string& name, const std::string& reason) {
-    logFormat(LogPriority::Error, "Message port %s: %s", name.c_str(), reason.c_str());
-}
-
 } // namespace
 
 LinuxMessagePorts::LinuxMessagePorts(PortOptions options) : _options(std::move(options)) {}
 
+void LinuxMessagePorts::fail(const std::string& name, const std::string& reason) {
+    _failure = reason;
+    logFormat(LogPriority::Error, "Message port %s: %s", name.c_str(), reason.c_str());
+}
+
 MessagePorts::Created LinuxMessagePorts::createLocal(const std::string& name, MessageCallback callback) {
+    _failure.clear();
     auto port = LinuxLocalPort::create(name, std::move(callback), _options);
     if (!port) {
-        logFailure(name, port.reason());
+        fail(name, port.reason());
         return {};
     }
     if (!*port)
@@ -48,10 +50,11 @@ MessagePorts::Created LinuxMessagePorts::createLocal(const std::string& name, Me
 }
 
 std::shared_ptr<RemotePort> LinuxMessagePorts::createRemote(const std::string& name) {
+    _failure.clear();
     auto port = LinuxRemotePort::connect(name, _options);
     if (port)
         return *std::move(port);
-    logFailure(name, port.reason());
+    fail(name, port.reason());
     return nullptr;
 }
 

@@ -6,6 +6,9 @@
 #include "Platform/Linux/Ports/PortOptions.h"
 #include "Platform/MessagePort.h"
 
+#include <memory>
+#include <string>
+
 namespace velmora {
 
 /// Message ports over Unix-domain stream sockets in one directory of the user's, served by the main thread's
@@ -16,9 +19,13 @@ public:
 
     [[nodiscard]] Created createLocal(const std::string& name, MessageCallback callback) override;
     [[nodiscard]] std::shared_ptr<RemotePort> createRemote(const std::string& name) override;
+    [[nodiscard]] std::string failure() const override { return _failure; }
 
 private:
+    void fail(const std::string& name, const std::string& reason);
+
     PortOptions _options;
+    std::string _failure;
 };
 
 } // namespace velmora
