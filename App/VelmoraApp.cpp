@@ -143,6 +143,8 @@ void VelmoraApp::updateViewControllerFromModel() {
 }
 
 void VelmoraApp::connectionChanged() {
+    if (!_model) // shut down, while a retry that is due keeps the model
+        return;
     updateStatusForViewController(static_cast<VelmoraPaneController&>(*_navController->topViewController()));
     updateNotice();
     const std::string line = _notice.line(_model->problem());

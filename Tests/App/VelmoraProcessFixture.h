@@ -41,15 +41,7 @@ protected:
 
     /// Its output goes to the files NAME.out and NAME.err, after the program unless another name is given.
     std::unique_ptr<QProcess> start(const char* program, const QStringList& arguments,
-                                    const char* name = nullptr) {
-        auto process = std::make_unique<QProcess>();
-        process->setProcessEnvironment(environment);
-        process->setStandardOutputFile(path(name ? name : program) + ".out");
-        process->setStandardErrorFile(path(name ? name : program) + ".err");
-        process->start(QString(VELMORA_BUILD_DIR "/") + program, arguments);
-        EXPECT_TRUE(process->waitForStarted());
-        return process;
-    }
+                                    const char* name = nullptr);
     std::unique_ptr<QProcess> startService(const char* scenario = "gsm") {
         auto service = start("velmora-telephonyd", {"--source", QString("scenario:%1,seed=1").arg(scenario)});
         EXPECT_TRUE(eventually([&] { return exists("ports/com.velmora.vox.server"); }));
