@@ -12,8 +12,8 @@ namespace velmora {
 
 class VelmoraModel;
 
-/// The words about the connection beyond its status: what is wrong and what its user can do, the same on the
-/// screen and in the log.
+/// The words about the connection beyond its status: the cause of a problem and what its user can do, the
+/// same on the screen and in the log.
 class ConnectionNotice {
 public:
     /// The service that the application was to start did not come up, for this reason; as long as none
