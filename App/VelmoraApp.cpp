@@ -6,6 +6,7 @@
 #include "App/VelmoraPaneController.h"
 #include "App/VelmoraSaveViewController.h"
 #include "Model/NodePath.h"
+#include "Platform/SystemLog.h"
 #include "Toolkit/Navigation/NavigationController.h"
 #include "Toolkit/Screen.h"
 #include "Toolkit/Window.h"
@@ -50,8 +51,20 @@ void VelmoraApp::applicationDidFinishLaunching(Application&) {
     _navController->setDelegate(this);
     _window->setRootViewController(_navController);
     _window->makeKeyAndVisible();
-    // The screen is up before the first exchange with the telephony service, which blocks.
-    _platform->model().queue.async([model = _model] { model->restartMonitor(); });
+    // The screen is up before the first exchange with the telephony service, which blocks. The display's
+    // server exposes a new window when it gets to it, which may be long after this task.
+    _platform->model().queue.async([this] { _window->whenPainted([this] { connectFirst(); }); });
+}
+
+void VelmoraApp::connectFirst() {
+    if (_willConnect)
+        if (const auto done = _willConnect(); !done) {
+            logFormat(LogPriority::Error, "telephony service: %s", done.reason().c_str());
+            _notice.setStartFailure(done.reason());
+            // Which needs no second line if nothing else has been started either.
+            _loggedProblem = _notice.line({ConnectionProblem::Kind::NoService, {}});
+        }
+    _model->restartMonitor();
 }
 
 void VelmoraApp::applicationWillTerminate() {
@@ -88,6 +101,20 @@ void VelmoraApp::closeSaveView() {
         return;
     _navController->dismissModalViewController(true);
     _saveViewController.reset();
+    if (std::exchange(_endsOnceSaved, false) && _hasNewSnapshot)
+        startAnew();
+}
+
+void VelmoraApp::startAnew() {
+    const ArrayRef contents = _model->getSaveContents();
+    if (allowSaveButton() && contents && !contents->empty() && !std::exchange(_offeredSave, true)) {
+        _endsOnceSaved = true;
+        _hasNewSnapshot = false;
+        showSaveView();
+        return;
+    }
+    _startsAnew = true;
+    terminate();
 }
 
 void VelmoraApp::updateStatusForViewController(VelmoraPaneController& pane) {
@@ -112,6 +139,33 @@ void VelmoraApp::updateViewControllerFromModel() {
     if (_model->isConnected())
         setUpdateMessage(_dateFormatter->stringFromDate(_platform->model().clock.now()));
     updateStatusForViewController(static_cast<VelmoraPaneController&>(*_navController->topViewController()));
+    updateNotice();
+}
+
+void VelmoraApp::connectionChanged() {
+    if (!_model) // shut down, while a retry that is due keeps the model
+        return;
+    updateStatusForViewController(static_cast<VelmoraPaneController&>(*_navController->topViewController()));
+    updateNotice();
+    const std::string line = _notice.line(_model->problem());
+    if (!line.empty() && line != _loggedProblem)
+        logLine(LogPriority::Error, line);
+    if (!line.empty() || _model->isConnected())
+        _loggedProblem = line;
+    if (!_model->isConnected())
+        _window->displayIfNeeded(); // the next attempt to connect may block for seconds
+}
+
+void VelmoraApp::updateNotice() {
+    if (std::string problem = _notice.sentences(_model->problem()); !problem.empty()) {
+        _navController->setNotice({std::move(problem), {}, {}});
+        return;
+    }
+    std::string change = ConnectionNotice::ofTechnologies(*_model);
+    if (change.empty())
+        _navController->setNotice({});
+    else
+        _navController->setNotice({std::move(change), "Start Anew", [this] { startAnew(); }});
 }
 
 void VelmoraApp::willShowViewController(NavigationController&, ViewController& viewController, bool) {

@@ -4,8 +4,10 @@
 #pragma once
 
 #include "App/AppPlatform.h"
+#include "App/ConnectionNotice.h"
 #include "App/DateFormatter.h"
 #include "Model/VelmoraModel.h"
+#include "Platform/Result.h"
 #include "Toolkit/Application.h"
 #include "Toolkit/ApplicationDelegate.h"
 #include "Toolkit/Navigation/NavigationControllerDelegate.h"
@@ -52,6 +54,19 @@ public:
     /// Switches the home screen's display of the received signal strength.
     void _setGSMRSSI(bool isShown);
 
+    /// What is done before the first attempt to connect, once the window is on the screen; a failure is
+    /// logged and shown. Set before the application runs.
+    void setWillConnect(std::function<Result<Done>()> willConnect) { _willConnect = std::move(willConnect); }
+
+    /// The notice's button after a change of technology: ends the application, for its caller to start it
+    /// anew. Where there is something to save and panes offer that, the save screen comes first: once a
+    /// snapshot is written the application ends; without one it takes another press.
+    void startAnew();
+    /// Whether the application has ended to be started anew.
+    [[nodiscard]] bool startsAnew() const { return _startsAnew; }
+    /// The save screen has written a snapshot.
+    void snapshotWritten() { _hasNewSnapshot = true; }
+
     /// Opens the save screen; does nothing while it is open.
     void showSaveView();
     /// Closes the save screen; does nothing when it is not open.
@@ -59,6 +74,7 @@ public:
 
     void updateStatusForViewController(VelmoraPaneController& pane);
     void updateViewControllerFromModel() override;
+    void connectionChanged() override;
     void willShowViewController(NavigationController& navigationController, ViewController& viewController,
                                 bool animated) override;
 
@@ -90,6 +106,11 @@ private:
         std::string updateMessage;
     };
 
+    void connectFirst();
+    /// What the bar above the panes says: the connection's problem, or that the panes do not show what is
+    /// received.
+    void updateNotice();
+
     std::unique_ptr<AppPlatform> _platform;
 
     std::shared_ptr<Window> _window;
@@ -100,6 +121,14 @@ private:
     std::unique_ptr<DateFormatter> _dateFormatter;
     [[maybe_unused]] std::string _updateMessage; ///< unused: the property has the text
     Properties _properties;
+
+    std::function<Result<Done>()> _willConnect;
+    ConnectionNotice _notice;
+    std::string _loggedProblem;
+    bool _startsAnew = false;
+    bool _offeredSave = false;    ///< the notice's button has opened the save screen
+    bool _endsOnceSaved = false;  ///< that save screen is open
+    bool _hasNewSnapshot = false; ///< and has written
 };
 
 } // namespace velmora

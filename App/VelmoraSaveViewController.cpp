@@ -89,6 +89,8 @@ void VelmoraSaveViewController::savePressed() {
     if (!writeSnapshot(path)) {
         logFormat(LogPriority::Error, "Unable to write snapshot to %s", path.c_str());
         Alert("File Error", "Unable to write file to disk", "Close").show();
+    } else {
+        _app.snapshotWritten();
     }
     // In both cases: a failure leaves only the notice.
     queueClosing();

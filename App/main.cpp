@@ -7,6 +7,7 @@
 #include "Platform/Linux/Files/FileResources.h"
 #include "Platform/Linux/Files/LargeAllocations.h"
 #include "Platform/Linux/Files/LinuxFileSystem.h"
+#include "Platform/Linux/ProcessRestart.h"
 #include "Platform/Linux/ProgramLog.h"
 #include "Platform/Linux/ServiceStarter.h"
 #include "Platform/Linux/StandardDescriptors.h"
@@ -20,6 +21,7 @@
 #include <cstdio>
 #include <iostream>
 #include <memory>
+#include <optional>
 #include <sstream>
 #include <string>
 
@@ -31,8 +33,7 @@ using namespace std::chrono_literals;
 constexpr int done = 0;
 constexpr int badUsage = 2;
 constexpr auto selfTestLimit = 60s;
-/// By then a service that is there has answered.
-constexpr auto serviceDelay = 3s;
+constexpr int cannotRestart = 1;
 
 struct Options {
     LinuxFileSystem::Options files;
@@ -72,7 +73,8 @@ void declare(CLI::App& app, Options& options) {
                "  velmora --start-service");
 }
 
-int show(const Options& options, char* program) {
+/// Absent where the application is to be started anew.
+std::optional<int> show(const Options& options, char* program) {
     // Before everything else, so that the last lines are still written.
     const ProgramLog log(options.log, options.logLevel, "velmora");
     FileResources files;
@@ -81,21 +83,13 @@ int show(const Options& options, char* program) {
     char* arguments[] = {program, nullptr};
     VelmoraApp app(count, arguments,
                    [&options] { return std::make_unique<LinuxAppPlatform>(options.files); });
-    if (options.startsService) {
-        // Before the first attempt to connect, since the next one comes seconds later.
-        if (const auto up = startTelephonyService(); !up)
-            logFormat(LogPriority::Error, "telephony service: %s", up.reason().c_str());
-    }
-    app.platform().model().queue.after(serviceDelay, [&app] {
-        if (!app.model().isConnected())
-            logLine(LogPriority::Error,
-                    "no telephony service answers; the installed one is started by: velmora --start-service, "
-                    "one with a synthetic drive by: velmora-telephonyd --source scenario:gsm,seed=1");
-    });
+    if (options.startsService)
+        app.setWillConnect([] { return startTelephonyService(); });
     std::unique_ptr<SelfTest> selfTest;
     if (options.isSelfTest)
         selfTest = std::make_unique<SelfTest>(app, selfTestLimit);
-    return app.run();
+    const int status = app.run();
+    return app.startsAnew() ? std::nullopt : std::optional(status);
 }
 
 } // namespace
@@ -115,5 +109,11 @@ int main(int argc, char** argv) {
         std::fputs(printableLines(words.str()).c_str(), stderr);
         return isDone ? done : badUsage;
     }
-    return show(options, argv[0]);
+    if (const std::optional<int> status = show(options, argv[0]))
+        return *status;
+    // The display, the ports and the log are closed.
+    const Failure failure = restartProcess(argv);
+    const ProgramLog log(options.log, options.logLevel, "velmora");
+    logLine(LogPriority::Error, failure.reason);
+    return cannotRestart;
 }

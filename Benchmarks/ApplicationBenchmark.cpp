@@ -172,6 +172,8 @@ Figures application(int argc, char** argv, std::int64_t begun_us) {
     });
     app.applicationDidFinishLaunching(app);
     platform->queue.runPending();
+    while (!app.model().isConnected()) // which takes a window that is on the screen
+        QApplication::processEvents(QEventLoop::WaitForMoreEvents);
     const auto show = [platform](const Data& message) {
         platform->ports.deliver(logChannelPortName(), 0, message);
         platform->queue.advance(std::chrono::seconds(2));

@@ -3,8 +3,8 @@
 
 #include "Model/VelmoraModel.h"
 
+#include "Model/ServiceCommands.h"
 #include "Platform/SystemLog.h"
-#include "PropertyLists/PropertyList.h"
 
 #include <chrono>
 
@@ -16,14 +16,8 @@ namespace {
 
 constexpr auto refreshInterval = 2s;
 constexpr auto retryDelay = 5s;
-constexpr auto commandTimeout = 1s;
 
-Result<Data> serialize(const DictionaryRef& command) {
-    Result<std::string> xml = writeXMLPropertyList(command);
-    if (!xml)
-        return Failure{xml.reason()};
-    return Data(std::vector<std::uint8_t>(xml->begin(), xml->end()));
-}
+using Problem = ConnectionProblem::Kind;
 
 } // namespace
 
@@ -44,8 +38,10 @@ bool VelmoraModel::isConnected() const {
 
 bool VelmoraModel::createPorts() {
     const std::optional<std::string> name = _platform.portName();
-    if (!name)
+    if (!name) {
+        setProblem(Problem::Port);
         return false;
+    }
 
     const std::weak_ptr<VelmoraModel> weakSelf = weak_from_this();
     MessagePorts::Created created = _platform.ports.createLocal(
@@ -57,19 +53,23 @@ bool VelmoraModel::createPorts() {
         });
     _recvPort = std::move(created.port);
     if (!_recvPort) {
+        setProblem(Problem::Port, _platform.ports.failure());
         logLine(LogPriority::Error, "Could not create local message port");
         return false;
     }
     if (created.alreadyExisted) {
         // The handle is kept all the same: the caller closes it with the rest.
+        setProblem(Problem::PortInUse);
         logLine(LogPriority::Error, "Local messsage port already exists");
         return false;
     }
     _recvPort->attachToMainQueue();
     _recvPort->setInvalidationCallback([weakSelf](LocalPort& port) {
         logFormat(LogPriority::Error, " ***** INVALIDATED %p *****", static_cast<void*>(&port));
-        if (const auto self = weakSelf.lock())
+        if (const auto self = weakSelf.lock()) {
+            self->setProblem(Problem::Lost);
             self->restartMonitor();
+        }
     });
     return openLogChannel(*name);
 }
@@ -82,6 +82,11 @@ bool VelmoraModel::openLogChannel(const std::string& name) {
                 self->refresh();
         });
     if (!connection) {
+        const std::string reason = _platform.ports.failure();
+        if (reason.empty())
+            setProblem(Problem::NoService);
+        else
+            setProblem(Problem::Unreachable, std::string(causeOf(Problem::Unreachable)) + ": " + reason);
         logLine(LogPriority::Error, "Could not create VoxServerConnection");
         return false;
     }
@@ -90,17 +95,20 @@ bool VelmoraModel::openLogChannel(const std::string& name) {
         _platform.telephony._VoxServerConnectionNetworkMonitorCreateLogChannel(*connection, name, remoteName);
     connection.reset(); // the channel outlives the connection that it was asked for on
     if (error.code != 0) {
+        setProblem(Problem::NoChannel);
         logFormat(LogPriority::Error,
                   "_VoxServerConnectionNetworkMonitorCreateLogChannel returns error: %ld!",
                   static_cast<long>(error.code));
         return false;
     }
     if (remoteName.empty()) {
+        setProblem(Problem::NoChannel);
         logLine(LogPriority::Error, "Could not create a log channel (Vox returned null port)!");
         return false;
     }
     _sendPort = _platform.ports.createRemote(remoteName);
     if (!_sendPort) {
+        setProblem(Problem::ChannelGone);
         logLine(LogPriority::Error, "Could not create the remote port!");
         return false;
     }
@@ -127,37 +135,21 @@ void VelmoraModel::destroyPorts() {
 }
 
 void VelmoraModel::configureGenerator() {
-    const DictionaryRef request = makeDictionary();
-    request->set(vox::getTechnologyKey, vox::getTechnologyKey);
-    const Result<Data> data = serialize(request);
-    if (!data) {
-        logLine(LogPriority::Error, " Could not generate GetTechnology command; cannot configure");
-        return;
-    }
-    const RemotePort::Answer answer = _sendPort->sendRequest(0, *data, commandTimeout, commandTimeout, true);
-    if (answer.status != PortStatus::Success) {
-        logFormat(LogPriority::Error, " ***** Could not send the GetTechnology command (got error=%d)",
-                  answer.status);
-        return;
-    }
-    if (!answer.reply) {
-        logLine(LogPriority::Error, " ***** No response to GetTechnology; cannot configure");
-        return;
-    }
-    const Result<Value> reply = readPropertyList(answer.reply->bytes(), messageLimits);
-    if (!reply) {
-        logLine(LogPriority::Error, " ***** Could not parse reply to GetTechnology; cannot configure");
-        return;
-    }
-    const Dictionary* answers = reply->asDictionary();
-    const Value* technology = answers ? answers->find(vox::getTechnologyKey) : nullptr;
+    const std::optional<Value> technology = askTechnology(*_sendPort);
     if (!technology) {
-        logLine(LogPriority::Error, " ***** Reply to GetTechnology had no answer; cannot configure");
+        setProblem(Problem::NoTechnology);
         return;
     }
     // An answer that is no string equals no technology, like an unknown name.
     const std::string* name = technology->asString();
     _logGenerator = name ? generatorFromTechnology(*name) : nullptr;
+    if (_logGenerator)
+        _technologies.setDecoder(*name, _state);
+    else
+        setProblem(Problem::NoDecoder, name ? "the telephony service's technology " +
+                                                  std::string(shortTechnologyName(*name)) +
+                                                  " has no decoder here, wanted one of " + technologyNames()
+                                            : "");
     logFormat(LogPriority::Error, "Got log generated: %p", static_cast<void*>(_logGenerator.get()));
 }
 
@@ -168,6 +160,7 @@ std::unique_ptr<LogGenerator> VelmoraModel::generatorFromTechnology(std::string_
 void VelmoraModel::startMonitor() {
     if (_displayUpdateTimer)
         return;
+    _problem = {};
     if (!createPorts()) {
         logLine(LogPriority::Error, "Could not create the ports necessary");
         retry();
@@ -179,7 +172,8 @@ void VelmoraModel::startMonitor() {
         retry();
         return;
     }
-    if (!sendStartCommand()) {
+    if (!sendStartCommand(*_sendPort, _logGenerator->getStartCommand())) {
+        setProblem(Problem::NotStarted);
         retry();
         return;
     }
@@ -189,32 +183,35 @@ void VelmoraModel::startMonitor() {
         if (const auto self = weakSelf.lock())
             self->refresh();
     });
-}
-
-bool VelmoraModel::sendStartCommand() {
-    const Result<Data> command = serialize(_logGenerator->getStartCommand());
-    if (!command) {
-        logLine(LogPriority::Error, " Could not generate PLIST");
-        return false;
-    }
-    const RemotePort::Answer answer = _sendPort->sendRequest(0, *command, commandTimeout, 0s, false);
-    if (answer.status != PortStatus::Success) {
-        logFormat(LogPriority::Error, " ***** Could not send the START command (got error=%d)",
-                  answer.status);
-        return false;
-    }
-    return true;
+    reportConnection();
 }
 
 void VelmoraModel::retry() {
     destroyPorts();
+    reportConnection();
     // The task holds the model: a retry that is due keeps it alive.
     _platform.queue.after(retryDelay, [self = shared_from_this()] { self->startMonitor(); });
 }
 
 void VelmoraModel::restartMonitor() {
     destroyPorts();
+    // Before the exchanges, which may block for seconds.
+    reportConnection();
     startMonitor();
+}
+
+void VelmoraModel::setProblem(ConnectionProblem::Kind kind, std::string cause) {
+    _problem = {kind, cause.empty() ? std::string(causeOf(kind)) : std::move(cause)};
+}
+
+void VelmoraModel::reportConnection() {
+    const bool connected = isConnected();
+    if (connected == _reportedConnected && _problem == _reportedProblem)
+        return;
+    _reportedConnected = connected;
+    _reportedProblem = _problem;
+    if (_observer)
+        _observer->connectionChanged();
 }
 
 void VelmoraModel::updateWithData(const Data& data) {

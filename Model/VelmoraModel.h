@@ -4,6 +4,8 @@
 #pragma once
 
 #include "LogGenerator/LogGenerator.h"
+#include "Model/ConnectionProblem.h"
+#include "Model/DisplayTechnology.h"
 #include "Model/VelmoraModelNode.h"
 #include "Platform/Clock.h"
 #include "Platform/MainQueue.h"
@@ -15,6 +17,7 @@
 #include <memory>
 #include <optional>
 #include <string>
+#include <string_view>
 
 namespace velmora {
 
@@ -24,6 +27,9 @@ public:
     virtual ~ModelObserver() = default;
     /// Runs on the main queue after new data; pulls the tree with topLevelNodes and nodeAtPath.
     virtual void updateViewControllerFromModel() = 0;
+    /// The connection or its problem has changed, which isConnected and problem show by now. Runs within the
+    /// change and may not destroy the model; what the model does next may block for seconds.
+    virtual void connectionChanged() {}
 };
 
 /// The platform that the model needs. All of it must outlive the model.
@@ -56,6 +62,14 @@ public:
 
     /// Whether both ports are open.
     [[nodiscard]] bool isConnected() const;
+    /// Why the latest attempt to connect failed. A connected model may have one too: the service does not
+    /// name its technology, and the decoder of the earlier connection goes on.
+    [[nodiscard]] const ConnectionProblem& problem() const { return _problem; }
+    /// The service's constant of the technology that the decoder is for; empty before there is one.
+    [[nodiscard]] const std::string& technology() const { return _technologies.ofDecoder(); }
+    /// The technology whose display the tree shows: an earlier one than technology() after a change to one
+    /// that writes into the display that is there. Empty where there is no display.
+    [[nodiscard]] std::string displayTechnology() const { return _technologies.ofDisplay(_state); }
 
     /// Opens the local port and the log channel. After a failure the local port may be open: the caller
     /// closes the ports.
@@ -93,8 +107,10 @@ protected:
 
 private:
     [[nodiscard]] bool openLogChannel(const std::string& name);
+    void setProblem(ConnectionProblem::Kind kind, std::string cause = {});
+    /// Has the observer notice what differs from the last time.
+    void reportConnection();
     void retry();
-    [[nodiscard]] bool sendStartCommand();
 
     ModelPlatform _platform;
     ModelObserver* _observer;
@@ -106,6 +122,11 @@ private:
     /// Set by every log message, cleared by `refresh`.
     bool _updated = false;
     std::unique_ptr<LogGenerator> _logGenerator;
+    ConnectionProblem _problem;
+    /// What the observer knows.
+    bool _reportedConnected = false;
+    ConnectionProblem _reportedProblem;
+    DisplayTechnology _technologies;
     /// Created once and never replaced: it survives reconnection and a change of decoder, so that a new
     /// decoder starts with what the earlier one left in it. That is intended.
     Dictionary _state;

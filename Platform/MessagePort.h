@@ -99,6 +99,9 @@ public:
     [[nodiscard]] virtual Created createLocal(const std::string& name, MessageCallback callback) = 0;
     /// Connects to the port of that name; null when there is none.
     [[nodiscard]] virtual std::shared_ptr<RemotePort> createRemote(const std::string& name) = 0;
+    /// Why the latest of these two calls has made no port; empty where it has made one, or where there is
+    /// simply none to connect to.
+    [[nodiscard]] virtual std::string failure() const { return {}; }
 };
 
 } // namespace velmora

@@ -3,6 +3,7 @@
 
 #pragma once
 
+#include <algorithm>
 #include <array>
 #include <cstdint>
 #include <functional>
@@ -68,6 +69,13 @@ inline constexpr std::string_view voxTechnologyPrefix = "kVoxLogChannelTechnolog
     if (technology.starts_with(voxTechnologyPrefix))
         technology.remove_prefix(voxTechnologyPrefix.size());
     return technology;
+}
+
+/// A technology's name on the screens: "Ostrel GSM" of "kVoxLogChannelTechnology_Ostrel_GSM".
+[[nodiscard]] inline std::string technologyTitle(std::string_view technology) {
+    std::string title(shortTechnologyName(technology));
+    std::replace(title.begin(), title.end(), '_', ' ');
+    return title;
 }
 
 /// The service's constant for a short name; a constant is returned as it is.

@@ -8,7 +8,9 @@
 #include "Toolkit/Widgets/Conversions.h"
 #include "Toolkit/Widgets/WindowWidget.h"
 
+#include <QEvent>
 #include <QGuiApplication>
+#include <QWindow>
 
 #include <utility>
 
@@ -81,6 +83,7 @@ Window::~Window() {
     window.onCancel = nullptr;
     window.onSave = nullptr;
     window.onFocus = nullptr;
+    window.onPainted = nullptr;
     window.hide();
     if (_impl->root)
         _impl->root->view().removeFromSuperview();
@@ -115,6 +118,21 @@ void Window::makeKeyAndVisible() {
         window.onFocus();
     if (_impl->root && appears)
         _impl->root->viewDidAppear(false);
+}
+
+void Window::whenPainted(std::function<void()> painted) {
+    WindowWidget& window = _impl->widget();
+    window.onPainted = std::move(painted);
+    window.checkPainted();
+}
+
+void Window::displayIfNeeded() {
+    const QWindow* const shown = _impl->widget().windowHandle();
+    if (!shown || !shown->isExposed())
+        return;
+    // New texts are laid out first.
+    QCoreApplication::sendPostedEvents(nullptr, QEvent::LayoutRequest);
+    _impl->widget().repaint();
 }
 
 bool Window::isHidden() const {

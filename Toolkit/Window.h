@@ -5,6 +5,7 @@
 
 #include "Toolkit/Geometry.h"
 
+#include <functional>
 #include <memory>
 
 class QWidget;
@@ -29,6 +30,12 @@ public:
 
     /// Brings the window up with the keyboard in it; the root controller is notified.
     void makeKeyAndVisible();
+    /// Calls `painted` once, from the event loop, when the window's contents are on the screen: soon where
+    /// they are, else after its first exposure. That comes from the display's server some time after the
+    /// window was made visible, and never while nothing of the window is to be seen.
+    void whenPainted(std::function<void()> painted);
+    /// Draws what has changed now, for a caller that blocks the event loop next.
+    void displayIfNeeded();
     [[nodiscard]] bool isHidden() const;
     /// Takes the window off the screen, or puts it back.
     void setHidden(bool isHidden);
@@ -38,8 +45,8 @@ public:
     /// What draws the window, for the toolkit and its tests. Its parts are found by object name:
     /// "velmora.header", "velmora.title", "velmora.back", "velmora.toolbar", "velmora.busy",
     /// "velmora.status", "velmora.save", "velmora.table", "velmora.row", "velmora.sheet",
-    /// "velmora.textField", and "velmora.saveButton", "velmora.cancelButton", "velmora.button" by role;
-    /// "velmora.alert" is a window of its own.
+    /// "velmora.textField", "velmora.notice", "velmora.noticeButton", and "velmora.saveButton",
+    /// "velmora.cancelButton", "velmora.button" by role; "velmora.alert" is a window of its own.
     [[nodiscard]] QWidget* widget() const;
 
 private:

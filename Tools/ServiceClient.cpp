@@ -18,12 +18,24 @@ ModelPlatform ServiceClient::platform() {
             }};
 }
 
-std::string timeoutMessage(const std::string& problem, double seconds) {
+std::string adviceAgainst(const ConnectionProblem& problem) {
+    return problem.kind == ConnectionProblem::Kind::NoService ? serviceAdvice
+                                                              : std::string(wayOutOf(problem.kind));
+}
+
+std::string timeoutMessage(const ConnectionProblem& problem, double seconds) {
     char time[32];
     std::snprintf(time, sizeof time, " after %g s", seconds);
-    if (problem.empty())
+    if (problem.cause.empty())
         return std::string(serviceTitle) + " has sent nothing" + time;
-    return problem + time + (problem == noService ? std::string("; ") + serviceAdvice : std::string());
+    const std::string advice = adviceAgainst(problem);
+    return problem.cause + time + (advice.empty() ? std::string() : "; " + advice);
+}
+
+std::string timeoutMessage(const std::string& problem, double seconds) {
+    using Kind = ConnectionProblem::Kind;
+    return timeoutMessage(ConnectionProblem{problem == noService ? Kind::NoService : Kind::None, problem},
+                          seconds);
 }
 
 } // namespace velmora

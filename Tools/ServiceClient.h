@@ -40,5 +40,9 @@ inline constexpr const char* serviceAdvice =
 /// Why a command ends that has waited for the service: the problem with the connection, empty where there was
 /// none but no message came, and what to do.
 [[nodiscard]] std::string timeoutMessage(const std::string& problem, double seconds);
+[[nodiscard]] std::string timeoutMessage(const ConnectionProblem& problem, double seconds);
+
+/// What a user of the command line can do about the problem; empty where that is nothing.
+[[nodiscard]] std::string adviceAgainst(const ConnectionProblem& problem);
 
 } // namespace velmora

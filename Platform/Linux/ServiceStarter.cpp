@@ -20,6 +20,7 @@
 #include <string>
 #include <system_error>
 #include <thread>
+#include <utility>
 
 namespace velmora {
 
@@ -42,6 +43,12 @@ bool answers() {
     const auto port =
         LinuxRemotePort::connect(std::string(vox::serverPortName), {}, std::make_shared<PortPeers>());
     return port && *port;
+}
+
+/// Why no service could serve this user, whichever is started; empty where one could.
+std::string obstacle() {
+    const auto directory = PortOptions{}.openDirectory();
+    return directory ? std::string() : directory.reason();
 }
 
 bool startUnit(std::chrono::milliseconds patience) {
@@ -92,6 +99,8 @@ Result<Done> startProgram(std::chrono::milliseconds patience) {
 } // namespace
 
 Result<Done> startTelephonyService(std::chrono::milliseconds patience) {
+    if (std::string reason = obstacle(); !reason.empty())
+        return Failure{std::move(reason)};
     if (answers())
         return Done();
     // A unit's ports are in the standard directory; where another one is named it would not be found.

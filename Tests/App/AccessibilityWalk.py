@@ -3,7 +3,8 @@
 """Uses the application as a screen reader does: from another process, through the accessibility tree.
 
 The real service and the real application run as processes. The walk goes two panes down and back, saves a
-snapshot, sees the service die and come back, and ends the application.
+snapshot, sees the service die and come back, then with another technology, starts the application anew, and
+ends it.
 """
 
 import os
@@ -47,8 +48,8 @@ class Walk:
     def start(self, program, *arguments):
         return subprocess.Popen([os.path.join(self.build, program), *arguments], env=self.environment)
 
-    def start_service(self):
-        self.service = self.start("velmora-telephonyd", "--source", "scenario:gsm,seed=1,speed=5")
+    def start_service(self, scenario="gsm"):
+        self.service = self.start("velmora-telephonyd", "--source", f"scenario:{scenario},seed=1,speed=5")
 
     def start_application(self):
         self.application = self.start("velmora", "--log", "stderr", "--log-level", "3")
@@ -132,12 +133,34 @@ class Walk:
         self.start_service()
         self.see("label", "Updated ")
         self.wait("the indicator hidden", lambda: self.find("animation") is None)
+        assert self.find("alert") is None, "a notice although all is well"
+
+        self.start_anew()
 
         self.application.terminate()
         assert self.application.wait(LIMIT_S) == 0, "the application did not end well"
         self.application = None
         left = [name for name in os.listdir(self.ports) if "BasebandStateReport" in name]
         assert not left, f"left behind: {left}"
+
+    def start_anew(self):
+        """Another technology: the notice, the save screen that comes first, and the same process again."""
+        self.service.terminate()
+        self.service.wait()
+        self.see("alert", "No telephony service answers.")
+        self.start_service("lte")
+        self.see("alert", "Now receiving Ostrel LTE. The panes show Ostrel GSM.")
+        self.see("list item", "Registration")
+        saved = len(os.listdir(self.snapshots))
+        self.press("push button", "Start Anew")
+        self.see("list item", "DLF binary (")
+        self.press("push button", "Save")
+        self.see("list item", "Idle Mode Neighbors")
+        self.see("label", "Updated ")
+        assert self.find("alert") is None, "the notice outlives its cause"
+        assert len(os.listdir(self.snapshots)) == saved + 1, "no snapshot from before"
+        arguments = open(f"/proc/{self.application.pid}/cmdline", "rb").read().split(b"\0")[1:-1]
+        assert arguments == [b"--log", b"stderr", b"--log-level", b"3"], arguments
 
     def end(self):
         for process in (self.application, self.service):

@@ -77,6 +77,7 @@ void AppFixture::launch() {
 void AppFixture::launchAndConnect() {
     launch();
     platform.queue.runPending();
+    runUntilIdle(); // the window is painted
     ASSERT_TRUE(app.model().isConnected());
 }
 

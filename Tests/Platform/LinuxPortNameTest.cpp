@@ -72,6 +72,21 @@ TEST_F(LinuxPortTest, ATakenNameGivesAHandleThatLeavesTheOwnerAlone) {
     EXPECT_THAT(_log.lines(), IsEmpty());
 }
 
+TEST_F(LinuxPortTest, AFailureIsThatOfTheLatestCall) {
+    LinuxMessagePorts ports(_options);
+    EXPECT_EQ(ports.failure(), "");
+    EXPECT_EQ(ports.createLocal("a/b", noAnswer).port, nullptr);
+    EXPECT_EQ(ports.failure(), "port name \"a/b\" holds a '/' or NUL");
+    // That there is no such port is no failure.
+    EXPECT_EQ(ports.createRemote("none"), nullptr);
+    EXPECT_EQ(ports.failure(), "");
+    EXPECT_EQ(ports.createRemote(""), nullptr);
+    EXPECT_EQ(ports.failure(), "an empty port name");
+    const auto owner = ports.createLocal("one", noAnswer);
+    EXPECT_EQ(ports.failure(), "");
+    _log.clear();
+}
+
 TEST_F(LinuxPortTest, ALostLockFileIsNotTheNextOwnersLoss) {
     auto first = listening("one");
     std::filesystem::remove(path("one.lock"));

@@ -13,7 +13,7 @@ struct FakeMessagePorts::Registry {
     std::map<std::string, Handler> handlers;
     std::vector<std::weak_ptr<FakeRemotePort>> remotePorts;
     std::vector<Sent> sent;
-    bool failNextLocal = false;
+    std::optional<std::string> nextLocalFailure;
 };
 
 class FakeMessagePorts::FakeLocalPort final : public LocalPort,
@@ -128,14 +128,18 @@ FakeMessagePorts::FakeMessagePorts() : _registry(std::make_shared<Registry>()) {
 FakeMessagePorts::~FakeMessagePorts() = default;
 
 MessagePorts::Created FakeMessagePorts::createLocal(const std::string& name, MessageCallback callback) {
-    if (std::exchange(_registry->failNextLocal, false))
+    _failure.clear();
+    if (const auto reason = std::exchange(_registry->nextLocalFailure, std::nullopt)) {
+        _failure = *reason;
         return {};
+    }
     auto port = std::make_shared<FakeLocalPort>(_registry, name, std::move(callback));
     const bool taken = port->takeName();
     return {std::move(port), !taken};
 }
 
 std::shared_ptr<RemotePort> FakeMessagePorts::createRemote(const std::string& name) {
+    _failure.clear();
     const auto handler = _registry->handlers.find(name);
     if (handler == _registry->handlers.end())
         return nullptr;
@@ -145,8 +149,8 @@ std::shared_ptr<RemotePort> FakeMessagePorts::createRemote(const std::string& na
     return port;
 }
 
-void FakeMessagePorts::failNextLocal() {
-    _registry->failNextLocal = true;
+void FakeMessagePorts::failNextLocal(std::string reason) {
+    _registry->nextLocalFailure = std::move(reason);
 }
 
 bool FakeMessagePorts::isTaken(const std::string& name) const {

@@ -42,8 +42,10 @@ public:
     [[nodiscard]] Created createLocal(const std::string& name, MessageCallback callback) override;
     [[nodiscard]] std::shared_ptr<RemotePort> createRemote(const std::string& name) override;
 
-    /// The next `createLocal` returns no port.
-    void failNextLocal();
+    [[nodiscard]] std::string failure() const override { return _failure; }
+
+    /// The next `createLocal` returns no port, for this reason.
+    void failNextLocal(std::string reason = {});
     /// Whether a local port owns the name.
     [[nodiscard]] bool isTaken(const std::string& name) const;
     /// Hands the message to the local port that owns the name. False, and nothing happens, when there is none
@@ -73,6 +75,7 @@ private:
     class FakeRemotePort;
 
     std::shared_ptr<Registry> _registry;
+    std::string _failure;
 };
 
 } // namespace velmora

@@ -73,6 +73,8 @@ std::optional<Data> FakeLogService::createChannel(const Data& request) {
 
 std::optional<Data> FakeLogService::command(const std::string& client, const Data& payload) {
     const Result<Value> parsed = readPropertyList(payload.bytes());
+    if (parsed->asDictionary()->contains(vox::getTechnologyKey) && _technology.empty())
+        return serialized(makeDictionary());
     if (parsed->asDictionary()->contains(vox::getTechnologyKey))
         return dictionaryOf(vox::getTechnologyKey, technologyConstant(_technology));
     if (std::shared_ptr<RemotePort> port = _ports.createRemote(client))

@@ -16,7 +16,7 @@ namespace velmora {
 /// started streaming. Its clients see its destruction as that of a killed service.
 class FakeLogService {
 public:
-    /// `technology` is a short name.
+    /// `technology` is a short name, or empty for a service that names none.
     FakeLogService(const std::filesystem::path& directory, std::string technology);
     ~FakeLogService();
     FakeLogService(const FakeLogService&) = delete;

@@ -45,6 +45,7 @@ std::unique_ptr<View> NavigationController::loadView() {
         popViewController(true);
     });
     stack->setToolbarHidden(_isToolbarHidden);
+    stack->setNotice(_notice);
     return stack;
 }
 
@@ -84,6 +85,12 @@ std::shared_ptr<ViewController> NavigationController::topViewController() const 
 void NavigationController::setToolbarHidden(bool isHidden, bool /*animated*/) {
     if (std::exchange(_isToolbarHidden, isHidden) != isHidden && isViewLoaded())
         stackView().setToolbarHidden(isHidden);
+}
+
+void NavigationController::setNotice(Notice notice) {
+    _notice = std::move(notice);
+    if (isViewLoaded())
+        stackView().setNotice(_notice);
 }
 
 void NavigationController::showTop(const std::shared_ptr<ViewController>& old, bool isPush, bool animated) {

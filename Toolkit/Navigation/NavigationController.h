@@ -5,6 +5,7 @@
 
 #include "Toolkit/Navigation/NavigationControllerDelegate.h"
 #include "Toolkit/Navigation/ViewController.h"
+#include "Toolkit/Notice.h"
 
 #include <memory>
 #include <vector>
@@ -46,6 +47,9 @@ public:
     /// True at first.
     [[nodiscard]] bool isToolbarHidden() const { return _isToolbarHidden; }
     void setToolbarHidden(bool isHidden, bool animated = false);
+    /// What the bar between header and pane says, on whatever pane; none at first.
+    void setNotice(Notice notice);
+    [[nodiscard]] const Notice& notice() const { return _notice; }
 
     void viewWillAppear(bool animated) override;
     void viewDidAppear(bool animated) override;
@@ -73,6 +77,7 @@ private:
 
     std::vector<std::shared_ptr<ViewController>> _panes;
     NavigationControllerDelegate* _delegate = nullptr;
+    Notice _notice;
     bool _isToolbarHidden = true;
     bool _isOnScreen = false;
 };

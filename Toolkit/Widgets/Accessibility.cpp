@@ -11,6 +11,7 @@
 #include "Toolkit/Widgets/SpinnerWidget.h"
 #include "Toolkit/Widgets/Tables/CellWidget.h"
 #include "Toolkit/Widgets/Tables/TableWidget.h"
+#include "Toolkit/Widgets/WrappedLabel.h"
 
 #include <QAccessible>
 #include <QAccessibleWidget>
@@ -121,6 +122,8 @@ QAccessibleInterface* makeInterface(const QString& /*className*/, QObject* objec
         return new RowAccessible(*cell);
     if (auto* const heading = dynamic_cast<HeadingLabel*>(object))
         return new QAccessibleWidget(heading, QAccessible::Heading);
+    if (auto* const notice = dynamic_cast<WrappedLabel*>(object))
+        return new QAccessibleWidget(notice, QAccessible::AlertMessage);
     if (auto* const sheet = dynamic_cast<SheetWidget*>(object))
         return new QAccessibleWidget(sheet, QAccessible::Dialog);
     if (auto* const spinner = dynamic_cast<SpinnerWidget*>(object))

@@ -11,7 +11,8 @@ class QWidget;
 
 namespace velmora {
 
-/// Registers the accessible interfaces of tables, rows, headings, sheets and busy indicators. Called once, by
+/// Registers the accessible interfaces of tables, rows, headings, notices, sheets and busy
+/// indicators. Called once, by
 /// the application.
 void installAccessibility();
 

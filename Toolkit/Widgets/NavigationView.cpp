@@ -17,10 +17,12 @@ constexpr double barHeight = 52;
 
 } // namespace
 
-NavigationView::NavigationView() : _header(new HeaderBar), _toolbar(new Toolbar) {
+NavigationView::NavigationView() : _header(new HeaderBar), _notice(new NoticeBar), _toolbar(new Toolbar) {
     widget()->setObjectName("velmora.navigation");
     setBackgroundColor(Color::ground);
     _header->setParent(widget());
+    _notice->setParent(widget());
+    _notice->hide();
     addSubview(_container);
     _toolbar->setParent(widget());
     _toolbar->hide();
@@ -30,6 +32,11 @@ NavigationView::~NavigationView() = default;
 
 void NavigationView::setToolbarHidden(bool isHidden) {
     _toolbar->setVisible(!isHidden);
+    layoutSubviews();
+}
+
+void NavigationView::setNotice(const Notice& notice) {
+    _notice->setNotice(notice);
     layoutSubviews();
 }
 
@@ -85,7 +92,12 @@ void NavigationView::layoutSubviews() {
     const auto whole = [](double value) { return static_cast<int>(std::lround(value)); };
     _header->setGeometry(0, 0, whole(bounds().width), whole(barHeight));
     _toolbar->setGeometry(0, whole(bounds().height - below), whole(bounds().width), whole(barHeight));
-    _container.setFrame({0, barHeight, bounds().width, std::max(bounds().height - barHeight - below, 0.0)});
+    const double room = std::max(bounds().height - barHeight - below, 0.0);
+    // However long its text, the notice leaves half of the room to the pane.
+    const double notice =
+        _notice->isHidden() ? 0 : std::min<double>(_notice->heightForWidth(whole(bounds().width)), room / 2);
+    _notice->setGeometry(0, whole(barHeight), whole(bounds().width), whole(notice));
+    _container.setFrame({0, barHeight + notice, bounds().width, room - notice});
     if (_pane)
         _pane->setFrame(_container.bounds());
 }

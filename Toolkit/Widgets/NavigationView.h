@@ -6,11 +6,12 @@
 #include "Toolkit/View.h"
 #include "Toolkit/Widgets/Animation.h"
 #include "Toolkit/Widgets/HeaderBar.h"
+#include "Toolkit/Widgets/NoticeBar.h"
 #include "Toolkit/Widgets/Toolbar.h"
 
 namespace velmora {
 
-/// What a navigation stack looks like: header, pane, toolbar.
+/// What a navigation stack looks like: header, notice where there is one, pane, toolbar.
 class NavigationView : public View {
 public:
     NavigationView();
@@ -19,6 +20,7 @@ public:
     [[nodiscard]] HeaderBar& header() { return *_header; }
     [[nodiscard]] Toolbar& toolbar() { return *_toolbar; }
     void setToolbarHidden(bool isHidden);
+    void setNotice(const Notice& notice);
 
     /// Replaces the old pane (there may be none): sliding in from the right for a push, uncovered from the
     /// left otherwise. An earlier animation ends first.
@@ -34,6 +36,7 @@ private:
     void placePane(double part) const;
 
     HeaderBar* _header;
+    NoticeBar* _notice;
     Toolbar* _toolbar;
     View _container;
     View* _pane = nullptr;

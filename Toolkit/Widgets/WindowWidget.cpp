@@ -7,6 +7,10 @@
 
 #include <QApplication>
 #include <QKeyEvent>
+#include <QPointer>
+#include <QWindow>
+
+#include <utility>
 
 namespace velmora {
 
@@ -43,6 +47,36 @@ WindowWidget* WindowWidget::main() {
 bool WindowWidget::isBackOrCancel(const QKeyEvent& event) {
     return event.key() == Qt::Key_Back || event.matches(QKeySequence::Cancel) ||
            (event.key() == Qt::Key_Left && event.modifiers() == Qt::AltModifier);
+}
+
+void WindowWidget::checkPainted() {
+    // Queued: the exposure itself is yet to be handled.
+    if (onPainted)
+        QMetaObject::invokeMethod(this, &WindowWidget::paintFirst, Qt::QueuedConnection);
+}
+
+void WindowWidget::paintFirst() {
+    if (!onPainted || !windowHandle() || !windowHandle()->isExposed())
+        return;
+    repaint();
+    // What has been drawn may still be on its way to the display server.
+    const QPointer<WindowWidget> self(this);
+    QGuiApplication::sync();
+    if (self)
+        if (const auto painted = std::exchange(onPainted, nullptr))
+            painted();
+}
+
+bool WindowWidget::eventFilter(QObject* watched, QEvent* event) {
+    if (watched == windowHandle() && event->type() == QEvent::Expose)
+        checkPainted();
+    return QWidget::eventFilter(watched, event);
+}
+
+void WindowWidget::showEvent(QShowEvent* event) {
+    QWidget::showEvent(event);
+    if (windowHandle())
+        windowHandle()->installEventFilter(this); // once, however often it is shown
 }
 
 void WindowWidget::keyPressEvent(QKeyEvent* event) {

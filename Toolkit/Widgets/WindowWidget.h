@@ -21,6 +21,8 @@ public:
     std::function<void()> onResize;
     std::function<void()> onCancel;
     std::function<void()> onSave;
+    /// Called once, when the window's contents are on the screen.
+    std::function<void()> onPainted;
     /// Sets the default keyboard focus when no widget has it.
     std::function<void()> onFocus;
 
@@ -33,9 +35,17 @@ public:
     [[nodiscard]] static WindowWidget* main();
     [[nodiscard]] static bool isBackOrCancel(const QKeyEvent& event);
 
+    /// Calls onPainted soon if the screen shows the window; else its first exposure does.
+    void checkPainted();
+
 protected:
+    bool eventFilter(QObject* watched, QEvent* event) override;
+    void showEvent(QShowEvent* event) override;
     void keyPressEvent(QKeyEvent* event) override;
     void resizeEvent(QResizeEvent* event) override;
+
+private:
+    void paintFirst();
 };
 
 } // namespace velmora

@@ -10,6 +10,7 @@ namespace velmora {
 namespace {
 
 using Kind = ConnectionLine::Kind;
+using Problem = ConnectionProblem::Kind;
 
 /// What the model writes while it connects, by the beginnings of its lines.
 struct Row {
@@ -19,27 +20,22 @@ struct Row {
 };
 
 constexpr std::array rows = {
-    Row{"Could not create local message port", Kind::Cause, "this program's port cannot be opened"},
-    Row{"Local messsage port already exists", Kind::Cause, "this program's port is in use"},
-    Row{" ***** INVALIDATED ", Kind::LastOfAttempt, "the connection to the telephony service is lost"},
+    Row{"Could not create local message port", Kind::Cause, causeOf(Problem::Port)},
+    Row{"Local messsage port already exists", Kind::Cause, causeOf(Problem::PortInUse)},
+    Row{" ***** INVALIDATED ", Kind::LastOfAttempt, causeOf(Problem::Lost)},
     Row{"Could not create VoxServerConnection", Kind::Cause, noService},
     Row{"_VoxServerConnectionNetworkMonitorCreateLogChannel returns error", Kind::Cause,
-        "the telephony service opens no log channel"},
-    Row{"Could not create a log channel", Kind::Cause, "the telephony service opens no log channel"},
-    Row{"Could not create the remote port!", Kind::Cause, "the telephony service's log channel is not there"},
-    Row{" ***** Could not send the GetTechnology command", Kind::Cause,
-        "the telephony service does not name its technology"},
-    Row{" ***** No response to GetTechnology", Kind::Cause,
-        "the telephony service does not name its technology"},
-    Row{" ***** Could not parse reply to GetTechnology", Kind::Cause,
-        "the telephony service does not name its technology"},
-    Row{" ***** Reply to GetTechnology had no answer", Kind::Cause,
-        "the telephony service does not name its technology"},
-    Row{" ***** Could not send the START command", Kind::LastOfAttempt,
-        "the telephony service does not take the start command"},
+        causeOf(Problem::NoChannel)},
+    Row{"Could not create a log channel", Kind::Cause, causeOf(Problem::NoChannel)},
+    Row{"Could not create the remote port!", Kind::Cause, causeOf(Problem::ChannelGone)},
+    Row{" ***** Could not send the GetTechnology command", Kind::Cause, causeOf(Problem::NoTechnology)},
+    Row{" ***** No response to GetTechnology", Kind::Cause, causeOf(Problem::NoTechnology)},
+    Row{" ***** Could not parse reply to GetTechnology", Kind::Cause, causeOf(Problem::NoTechnology)},
+    Row{" ***** Reply to GetTechnology had no answer", Kind::Cause, causeOf(Problem::NoTechnology)},
+    Row{" ***** Could not send the START command", Kind::LastOfAttempt, causeOf(Problem::NotStarted)},
     Row{"Could not create the ports necessary", Kind::LastOfAttempt, {}},
     Row{"No log generator technology works", Kind::LastOfAttempt, {}},
-    Row{"Got log generated: (nil)", Kind::Cause, "the telephony service's technology has no decoder here"},
+    Row{"Got log generated: (nil)", Kind::Cause, causeOf(Problem::NoDecoder)},
 };
 
 } // namespace

@@ -3,6 +3,8 @@
 
 #pragma once
 
+#include "Model/ConnectionProblem.h"
+
 #include <cstdint>
 #include <string>
 #include <string_view>
@@ -23,6 +25,6 @@ struct ConnectionLine {
 [[nodiscard]] ConnectionLine parseConnectionLine(std::string_view text);
 
 /// The problem of an attempt that found no service.
-inline constexpr std::string_view noService = "no telephony service answers";
+inline constexpr std::string_view noService = causeOf(ConnectionProblem::Kind::NoService);
 
 } // namespace velmora

@@ -8,7 +8,6 @@
 #include "Platform/Linux/SignalWatcher.h"
 #include "Platform/TelephonyService.h"
 #include "Tools/ExitStatus.h"
-#include "Tools/Log/ConnectionLine.h"
 #include "Tools/Log/DecoderLog.h"
 #include "Tools/Log/ServiceLog.h"
 #include "Tools/Output.h"
@@ -46,7 +45,7 @@ public:
         else
             _view = std::make_unique<PipeView>(output);
         // Over the view's own, which holds what is written.
-        _log.emplace(lines, [this](const std::string& problem) { showProblem(problem); });
+        _log.emplace(lines);
     }
 
     /// Until the user, a signal or a closed pipe ends it.
@@ -72,7 +71,9 @@ public:
 
     void updateViewControllerFromModel() override {
         const NodeRef root = displayNodes();
-        clearProblem();
+        showProblem();
+        if (_shownProblem.cause.empty())
+            _view->showNote({}, {}); // of a change of technology
         if (_model->isConnected())
             _updateMessage = "Updated " + localDateAndTime(_client.clock, _client.clock.now(), " at ");
         _shownStatus = status();
@@ -82,6 +83,8 @@ public:
             _client.loop.quit(ExitStatus::Done);
     }
 
+    void connectionChanged() override { showProblem(); }
+
 private:
     [[nodiscard]] std::shared_ptr<VelmoraModel> newModel() {
         WatchModel::Events events;
@@ -89,30 +92,22 @@ private:
             _view->showNote("the technology is " + std::string(shortTechnologyName(technology)) + " now", {});
             _client.queue.async([this] { beginAnew(); });
         };
-        events.unknown = [this](std::string_view technology) {
-            _log->setCause("the telephony service's technology " +
-                           std::string(shortTechnologyName(technology)) +
-                           " has no decoder here, wanted one of " + technologyNames());
-        };
         return std::make_shared<WatchModel>(_client.platform(), this, _lines, std::move(events));
     }
 
-    void showProblem(const std::string& problem) {
-        _view->showNote(problem, problem == noService ? serviceAdvice : std::string());
-    }
-
-    void clearProblem() {
-        if (!_model->isConnected())
+    /// Once for each change of it.
+    void showProblem() {
+        if (_shownProblem == _model->problem())
             return;
-        _log->clearProblem();
-        _view->showNote({}, {});
+        _shownProblem = _model->problem();
+        _view->showNote(_shownProblem.cause, adviceAgainst(_shownProblem));
     }
 
     /// There has been time for the first refresh.
     void giveUp() {
         if (_hasRefresh)
             return;
-        report(timeoutMessage(_log->problem(), *_options.timeout_seconds));
+        report(timeoutMessage(_shownProblem, *_options.timeout_seconds));
         _client.loop.quit(ExitStatus::BadInput);
     }
 
@@ -134,8 +129,6 @@ private:
             _client.loop.quit(ExitStatus::Done);
             return;
         }
-        if (!_log->problem().empty())
-            clearProblem();
         // Connected again, but without a refresh so far: the line stays until there is one.
         if (_options.once || _model->isConnected() || _shownStatus == connecting)
             return;
@@ -150,6 +143,7 @@ private:
     std::shared_ptr<VelmoraModel> _model;
     std::unique_ptr<WatchView> _view;
     std::optional<ServiceLog> _log;
+    ConnectionProblem _shownProblem;
     std::unique_ptr<Timer> _statusTimer;
     std::string _updateMessage = connecting;
     std::string _shownStatus;

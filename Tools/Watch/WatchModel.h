@@ -20,7 +20,6 @@ class WatchModel final : public VelmoraModel {
 public:
     struct Events {
         std::function<void(std::string_view technology)> changed;
-        std::function<void(std::string_view technology)> unknown; ///< there is no decoder for it
     };
 
     WatchModel(ModelPlatform platform, ModelObserver* observer, DecoderLines& lines, Events events)
@@ -37,18 +36,11 @@ protected:
         if (!_technology.empty() && _technology != technology)
             _events.changed(technology);
         _technology = technology;
-        std::unique_ptr<LogGenerator> decoder = makeDecoder(technology);
-        if (!decoder)
-            _events.unknown(technology);
-        return decoder;
-    }
-
-private:
-    [[nodiscard]] std::unique_ptr<LogGenerator> makeDecoder(std::string_view technology) {
         const DecoderLog log(_lines);
         return VelmoraModel::generatorFromTechnology(technology);
     }
 
+private:
     DecoderLines& _lines;
     Events _events;
     std::string _technology;

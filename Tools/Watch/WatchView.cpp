@@ -56,11 +56,14 @@ void ScreenView::showNote(const std::string& note, const std::string& advice) {
         draw();
 }
 
-/// The rows, or the advice, a row for each window's width of it.
+/// The rows, or the advice, a row for each window's width of it, with the note where the status line cuts
+/// that.
 std::vector<TreeRow> ScreenView::shownRows() const {
     if (!_rows.empty() || _advice.empty())
         return _rows;
-    return adviceRows(_advice, _terminal.size().columns);
+    const std::size_t columns = _terminal.size().columns;
+    const bool isCut = displayWidth(_status + " " + _note) > columns;
+    return adviceRows(isCut ? _note + "; " + _advice : _advice, columns);
 }
 
 void ScreenView::restoreTerminal() {
@@ -83,7 +86,9 @@ void ScreenView::handleInput(std::string_view bytes) {
 }
 
 void ScreenView::draw() {
-    const std::string status = _note.empty() ? _status : _status + " " + _note;
+    std::string status = _note.empty() ? _status : _status + " " + _note;
+    if (!_rows.empty() && !_advice.empty())
+        status += "; " + _advice;
     _terminal.draw(composeFrame(shownRows(), status, _terminal.size(), _scroll));
 }
 

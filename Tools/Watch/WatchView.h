@@ -46,7 +46,8 @@ private:
     bool _begun = false;
 };
 
-/// Shows the latest refresh on the terminal, a note after the status, and the advice where there are no rows.
+/// Shows the latest refresh on the terminal, a note after the status, and the advice in place of the rows, or
+/// after the note where there are rows.
 /// Log lines that would run into the screen are held until it is restored.
 class ScreenView final : public WatchView {
 public:

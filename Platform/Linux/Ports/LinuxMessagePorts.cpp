@@ -33,15 +33,17 @@ private:
 LinuxMessagePorts::LinuxMessagePorts(PortOptions options)
     : _options(std::move(options)), _peers(std::make_shared<PortPeers>(_options.frameMemory)) {}
 
-void LinuxMessagePorts::logFailure(const std::string& name, const std::string& reason) {
+void LinuxMessagePorts::fail(const std::string& name, const std::string& reason) {
+    _failure = reason;
     _peers->log().format(LogPriority::Error, "ports that failed", "Message port %s: %s", name.c_str(),
                          reason.c_str());
 }
 
 MessagePorts::Created LinuxMessagePorts::createLocal(const std::string& name, MessageCallback callback) {
+    _failure.clear();
     auto port = LinuxLocalPort::create(name, std::move(callback), _options, _peers);
     if (!port) {
-        logFailure(name, port.reason());
+        fail(name, port.reason());
         return {};
     }
     if (!*port)
@@ -50,10 +52,11 @@ MessagePorts::Created LinuxMessagePorts::createLocal(const std::string& name, Me
 }
 
 std::shared_ptr<RemotePort> LinuxMessagePorts::createRemote(const std::string& name) {
+    _failure.clear();
     auto port = LinuxRemotePort::connect(name, _options, _peers);
     if (port)
         return *std::move(port);
-    logFailure(name, port.reason());
+    fail(name, port.reason());
     return nullptr;
 }
 

@@ -7,6 +7,9 @@
 #include "Platform/Linux/Ports/PortPeers.h"
 #include "Platform/MessagePort.h"
 
+#include <memory>
+#include <string>
+
 namespace velmora {
 
 /// Message ports over Unix-domain stream sockets in one directory of the user's, served by the main thread's
@@ -17,13 +20,15 @@ public:
 
     [[nodiscard]] Created createLocal(const std::string& name, MessageCallback callback) override;
     [[nodiscard]] std::shared_ptr<RemotePort> createRemote(const std::string& name) override;
+    [[nodiscard]] std::string failure() const override { return _failure; }
 
 private:
     /// The name is a peer's where a service connects to its clients.
-    void logFailure(const std::string& name, const std::string& reason);
+    void fail(const std::string& name, const std::string& reason);
 
     PortOptions _options;
     std::shared_ptr<PortPeers> _peers;
+    std::string _failure;
 };
 
 } // namespace velmora

@@ -120,7 +120,9 @@ TEST_F(WatchCommandTest, AnUnusablePortDirectoryIsReported) {
     EXPECT_EQ(process.exitStatus(), 1);
     const std::string problem =
         "velmora-log: port directory " + path("ports") + " has mode 0777, wanted 0700";
-    EXPECT_EQ(ownMessages(process.errors()), problem + "\n" + problem + " after 0.3 s\n");
+    const std::string advice =
+        "; mend that, or name another directory in VELMORA_PORT_DIR, for the service too\n";
+    EXPECT_EQ(ownMessages(process.errors()), problem + advice + problem + " after 0.3 s" + advice);
 }
 
 TEST_F(WatchCommandTest, ATechnologyWithoutADecoderIsReported) {
@@ -128,9 +130,22 @@ TEST_F(WatchCommandTest, ATechnologyWithoutADecoderIsReported) {
     ToolProcess process(tool({"watch"}));
     EXPECT_TRUE(process.waitForError(
         "velmora-log: the telephony service's technology Ostrel_NR has no decoder here, wanted one of IFX, "
-        "Ostrel_GSM, Ostrel_CDMA, Ostrel_LTE, Ostrel_UTRAN2\n"));
+        "Ostrel_GSM, Ostrel_CDMA, Ostrel_LTE, Ostrel_UTRAN2; start the service with another source\n"));
     process.signal(SIGINT);
     EXPECT_EQ(process.exitStatus(), 0);
+}
+
+TEST_F(WatchCommandTest, AServiceThatNamesNoTechnologyIsReportedOnce) {
+    startService("");
+    ToolProcess process(tool({"watch"}));
+    const std::string line = "velmora-log: the telephony service does not name its technology; it may have "
+                             "no modem yet, which its "
+                             "own log says; if it has, restart it\n";
+    EXPECT_TRUE(process.waitForError(line));
+    ASSERT_TRUE(process.waitFor("Connecting...\n"));
+    process.signal(SIGINT);
+    EXPECT_EQ(process.exitStatus(), 0);
+    EXPECT_EQ(ownMessages(process.errors()), line);
 }
 
 TEST_F(WatchCommandTest, ClosedPipeEndsItQuietlyWithoutARefresh) {

@@ -90,8 +90,20 @@ TEST_F(WatchTerminalTest, TheScreenSaysWhatIsWrongAndWhatToStart) {
                 StartsWith("\x1b[7mUpdated "));
     // The rows stay when the service goes.
     _service.reset();
-    ASSERT_TRUE(process.waitFor("Connecting... no telephony service answers", *refreshed));
+    ASSERT_TRUE(process.waitFor("Connecting... no telephony service answers; start one with", *refreshed));
     EXPECT_THAT(process.output().substr(process.output().rfind("\x1b[H")), StartsWith("\x1b[HRow 0 "));
+    process.type("q");
+    EXPECT_EQ(process.exitStatus(), 0);
+}
+
+TEST_F(WatchTerminalTest, ANoteThatTheStatusLineCutsIsShownWholeAbove) {
+    startService("");
+    ToolProcess process(onTerminal({"watch"}));
+    // Of 60 columns the status takes 14.
+    ASSERT_TRUE(process.waitFor("Connecting... the telephony service does not name its techn…"));
+    EXPECT_THAT(process.output(),
+                HasSubstr("\x1b[Hthe telephony service does not name its technology; it may"));
+    EXPECT_THAT(process.output(), HasSubstr("\r\r\nrestart it\x1b[K"));
     process.type("q");
     EXPECT_EQ(process.exitStatus(), 0);
 }
