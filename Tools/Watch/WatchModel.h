@@ -46,7 +46,11 @@ protected:
 private:
     [[nodiscard]] std::unique_ptr<LogGenerator> makeDecoder(std::string_view technology) {
         const DecoderLog log(_lines);
-        return VelmoraModel::generatorFromTechnology(technology);
+        std::unique_ptr<LogGenerator> decoder = VelmoraModel::generatorFromTechnology(technology);
+        // It is for snapshots, which are not made here, and holds the messages of five refreshes.
+        if (decoder)
+            decoder->setKeepsHistory(false);
+        return decoder;
     }
 
     DecoderLines& _lines;
