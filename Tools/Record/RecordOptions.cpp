@@ -7,6 +7,13 @@
 
 namespace velmora {
 
+namespace {
+
+/// Months of the fastest modem; what is above is a slip of the finger.
+constexpr std::uint64_t maximumCount = 1'000'000'000'000;
+
+} // namespace
+
 CLI::App* addRecord(CLI::App& app, RecordOptions& options) {
     CLI::App* command =
         app.add_subcommand("record", "Record the telephony service's messages until interrupted");
@@ -16,7 +23,7 @@ CLI::App* addRecord(CLI::App& app, RecordOptions& options) {
         ->check(positiveSeconds())
         ->type_name("SECONDS");
     command->add_option("--count", options.count, "Stop after this many messages")
-        ->check(positiveCount())
+        ->check(countUpTo(maximumCount))
         ->type_name("N");
     command
         ->add_option(
