@@ -50,12 +50,16 @@ SignalWatcher::SignalWatcher(Callback callback)
     signalPipe = ends[1];
     setHandler(SIGINT, velmoraForwardSignal, &_earlierInterrupt);
     setHandler(SIGTERM, velmoraForwardSignal, &_earlierTerminate);
+    ::sigaction(SIGHUP, nullptr, &_earlierHangUp);
+    if (_earlierHangUp.sa_handler != SIG_IGN)
+        setHandler(SIGHUP, velmoraForwardSignal, &_earlierHangUp);
     setHandler(SIGPIPE, SIG_IGN, &_earlierPipe);
 }
 
 SignalWatcher::~SignalWatcher() {
     ::sigaction(SIGINT, &_earlierInterrupt, nullptr);
     ::sigaction(SIGTERM, &_earlierTerminate, nullptr);
+    ::sigaction(SIGHUP, &_earlierHangUp, nullptr);
     ::sigaction(SIGPIPE, &_earlierPipe, nullptr);
     signalPipe = -1;
 }

@@ -12,9 +12,10 @@
 
 namespace velmora {
 
-/// Turns SIGINT and SIGTERM into a call on the main thread, so that a program stops cleanly, and lets SIGPIPE
-/// be ignored, so that writing to a closed pipe is an error like any other. One a process at a time;
-/// destroying it restores the earlier signal handlers. Main thread only, on its event loop.
+/// Turns SIGINT, SIGTERM and SIGHUP into a call on the main thread, so that a program stops cleanly, and lets
+/// SIGPIPE be ignored, so that writing to a closed pipe is an error like any other. A SIGHUP that is ignored,
+/// as nohup(1) has it, stays ignored. One a process at a time; destroying it restores the earlier signal
+/// handlers. Main thread only, on its event loop.
 class SignalWatcher {
 public:
     using Callback = std::function<void(int signalNumber)>;
@@ -36,6 +37,7 @@ private:
     std::unique_ptr<SocketWatch> _watch;
     struct sigaction _earlierInterrupt = {};
     struct sigaction _earlierTerminate = {};
+    struct sigaction _earlierHangUp = {};
     struct sigaction _earlierPipe = {};
 };
 

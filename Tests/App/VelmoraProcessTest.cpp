@@ -128,9 +128,10 @@ TEST_P(VelmoraSignalTest, EndsItCleanly) {
     end(*service);
 }
 
-INSTANTIATE_TEST_SUITE_P(Signals, VelmoraSignalTest, testing::Values(SIGINT, SIGTERM), [](const auto& row) {
-    return std::string(row.param == SIGINT ? "Interrupt" : "Terminate");
-});
+INSTANTIATE_TEST_SUITE_P(
+    Signals, VelmoraSignalTest, testing::Values(SIGINT, SIGTERM, SIGHUP), [](const auto& row) {
+        return std::string(row.param == SIGINT ? "Interrupt" : row.param == SIGTERM ? "Terminate" : "HangUp");
+    });
 
 TEST_F(VelmoraProcessTest, WithoutAServiceTheLogSaysHowToStartOne) {
     const auto app = start("velmora", {"--log", "stderr"});

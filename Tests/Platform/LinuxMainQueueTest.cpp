@@ -114,10 +114,24 @@ TEST(LinuxSignalWatcher, SignalsArriveOnTheMainThreadAndPipesBreakWithoutOne) {
     const SignalWatcher watcher([&](int signalNumber) { seen.push_back(signalNumber); });
     ASSERT_EQ(::raise(SIGTERM), 0);
     ASSERT_EQ(::raise(SIGINT), 0);
+    ASSERT_EQ(::raise(SIGHUP), 0);
     ASSERT_EQ(::raise(SIGPIPE), 0);
     EXPECT_TRUE(seen.empty());
-    ASSERT_TRUE(eventually([&] { return seen.size() == 2; }));
-    EXPECT_THAT(seen, ElementsAre(SIGTERM, SIGINT));
+    ASSERT_TRUE(eventually([&] { return seen.size() == 3; }));
+    EXPECT_THAT(seen, ElementsAre(SIGTERM, SIGINT, SIGHUP));
+}
+
+TEST(LinuxSignalWatcher, AnIgnoredHangUpStaysIgnored) {
+    const auto earlier = ::signal(SIGHUP, SIG_IGN);
+    std::vector<int> seen;
+    {
+        const SignalWatcher watcher([&](int signalNumber) { seen.push_back(signalNumber); });
+        ASSERT_EQ(::raise(SIGHUP), 0);
+        ASSERT_EQ(::raise(SIGTERM), 0);
+        ASSERT_TRUE(eventually([&] { return !seen.empty(); }));
+    }
+    EXPECT_THAT(seen, ElementsAre(SIGTERM));
+    EXPECT_EQ(::signal(SIGHUP, earlier), SIG_IGN);
 }
 
 TEST(LinuxSignalWatcher, TheEarlierHandlersComeBack) {

@@ -48,7 +48,7 @@ protected:
 };
 
 TEST_F(TelephonydTest, streamsTheScenarioAndStopsCleanly) {
-    for (const int signalNumber : {SIGTERM, SIGINT}) {
+    for (const int signalNumber : {SIGTERM, SIGINT, SIGHUP}) {
         const auto service = start({"--source", "scenario:gsm,seed=3,speed=100", "--log-level", "5"});
         TestClient client(directory.path(), "com.velmora.test.client");
         ASSERT_TRUE(client.connect()) << service->standardError();
