@@ -61,6 +61,7 @@ private:
 
     void receive(const Data& message) override;
     [[nodiscard]] bool hasRoom() const override;
+    void sourceEnded() override;
 
     [[nodiscard]] Value createChannel(const Data& request);
     [[nodiscard]] std::shared_ptr<LocalPort> createChannelPort();
@@ -80,6 +81,7 @@ private:
     std::vector<ChannelRef> _channels;
     std::uint64_t _channelsMade = 0;
     bool _sourceRuns = false;
+    bool _sourceEnded = false;                  ///< its present run has no more messages
     std::map<std::uint16_t, Data> _latestExtra; ///< of the source's present run, by code
     /// Queued tasks hold it weakly: they do nothing after the server's destruction.
     std::shared_ptr<bool> _alive = std::make_shared<bool>(true);
