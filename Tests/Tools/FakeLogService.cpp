@@ -53,6 +53,11 @@ void FakeLogService::send(const Data& message) {
         client->post(0, message);
 }
 
+void FakeLogService::sendEnd() {
+    for (const auto& client : _clients)
+        client->post(1, Data());
+}
+
 bool FakeLogService::isAllTaken() const {
     return std::all_of(_clients.begin(), _clients.end(),
                        [](const auto& client) { return client->waitingMessages() == 0; });
@@ -73,6 +78,8 @@ std::optional<Data> FakeLogService::createChannel(const Data& request) {
 
 std::optional<Data> FakeLogService::command(const std::string& client, const Data& payload) {
     const Result<Value> parsed = readPropertyList(payload.bytes());
+    if (parsed->asDictionary()->contains(vox::getTechnologyKey) && _technology.empty())
+        return std::nullopt;
     if (parsed->asDictionary()->contains(vox::getTechnologyKey))
         return dictionaryOf(vox::getTechnologyKey, technologyConstant(_technology));
     if (std::shared_ptr<RemotePort> port = _ports.createRemote(client))

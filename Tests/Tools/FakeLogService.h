@@ -16,7 +16,7 @@ namespace velmora {
 /// started streaming. Its clients see its destruction as that of a killed service.
 class FakeLogService {
 public:
-    /// `technology` is a short name.
+    /// `technology` is a short name; empty for a service that does not name one.
     FakeLogService(const std::filesystem::path& directory, std::string technology);
     ~FakeLogService();
     FakeLogService(const FakeLogService&) = delete;
@@ -25,6 +25,8 @@ public:
     /// Clients that have sent their start command.
     [[nodiscard]] std::size_t streaming() const { return _clients.size(); }
     void send(const Data& message);
+    /// Says that no more messages follow.
+    void sendEnd();
     /// Whether every client has taken all that was sent.
     [[nodiscard]] bool isAllTaken() const;
 
