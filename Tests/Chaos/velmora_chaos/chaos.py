@@ -10,6 +10,7 @@ from velmora_chaos.clients import run_clients
 from velmora_chaos.flood import run_flood
 from velmora_chaos.hostile import run_hostile
 from velmora_chaos.options import Options, parse_options
+from velmora_chaos.recordings import run_recordings
 from velmora_chaos.restarts import Victim, run_restarts
 
 Experiment = Callable[[Options], None]
@@ -19,6 +20,7 @@ EXPERIMENTS: Mapping[str, Experiment] = {
     "application_restarts": lambda options: run_restarts(options, Victim.APPLICATION),
     "clients": run_clients,
     "hostile": run_hostile,
+    "recordings": run_recordings,
     "flood": run_flood,
 }
 

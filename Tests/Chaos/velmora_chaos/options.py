@@ -14,6 +14,8 @@ DESCRIPTION = """Stress tests of the telephony service and the application, obse
   clients   ten clients at once beside one that never reads and one that sends malformed frames
   hostile   a thousand hostile connections, to the service, its log channel and the application, beside an
             honest client that misses at most one redraw
+  recordings  files are removed, truncated, moved and replaced while a recorder writes to them, and a second
+            recorder wants them; the recorder says so within a second, and no message is lost
   flood     100,000 messages a second: the screen answers in time, memory stays bounded, and what a slow
             client does not take is counted and logged
 """

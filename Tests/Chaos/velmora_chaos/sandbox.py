@@ -76,6 +76,10 @@ class Sandbox:
         """A live display on a pipe."""
         return self._start("velmora-log", "watch")
 
+    def recorder(self, file: Path, *options: str) -> Program:
+        """A recorder into that file; its standard error is read."""
+        return self._start("velmora-log", "record", *options, str(file), reads_errors=True)
+
     def _start(self, program: str, *arguments: str, reads_errors: bool = False) -> Program:
         process = subprocess.Popen(
             [str(self._build / program), *arguments],
