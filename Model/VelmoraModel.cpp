@@ -49,6 +49,8 @@ bool VelmoraModel::createPorts() {
             const auto self = weakSelf.lock();
             if (self && messageId == 0)
                 self->updateWithData(payload);
+            else if (self)
+                self->takeOtherMessage(messageId);
             return std::nullopt;
         });
     _recvPort = std::move(created.port);

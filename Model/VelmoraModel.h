@@ -13,6 +13,7 @@
 #include "Platform/TelephonyService.h"
 #include "PropertyLists/Value.h"
 
+#include <cstdint>
 #include <functional>
 #include <memory>
 #include <optional>
@@ -85,6 +86,9 @@ public:
 
     /// Passes one log message to the decoder.
     virtual void updateWithData(const Data& data);
+
+    /// A message of another id than log messages have; ignored.
+    virtual void takeOtherMessage(std::int32_t /*messageId*/) {}
 
     /// The timer's action: notices a dead service, and has the screens redrawn if anything arrived.
     void refresh();

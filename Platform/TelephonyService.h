@@ -147,6 +147,9 @@ inline constexpr std::string_view setStateKey = "SetState";
 inline constexpr std::string_view streamingState = "Streaming";
 inline constexpr std::string_view setOstrelLogCodesKey = "SetOstrelLogCodes";
 inline constexpr std::string_view setVoxExtraCodesKey = "SetVoxExtraCodes";
+/// Log messages have id 0. An empty message of this id after the last one says that the source has ended: no
+/// more follow until the service starts it again. Clients may ignore it.
+inline constexpr std::int32_t sourceEndedMessage = 1;
 } // namespace vox
 
 } // namespace velmora

@@ -6,7 +6,9 @@
 #include "Tools/Technologies.h"
 
 #include <algorithm>
+#include <charconv>
 #include <cstdint>
+#include <system_error>
 #include <utility>
 
 namespace velmora {
@@ -30,13 +32,17 @@ CLI::Validator oneOf(const std::vector<std::string>& words) {
         expected);
 }
 
-CLI::Validator positiveCount() {
+CLI::Validator countUpTo(std::uint64_t most) {
     return validator(
-        [](const std::string& text) {
+        [most](const std::string& text) {
+            // The library's conversion wraps negative numbers around, clamps large ones and knows other
+            // bases.
             std::uint64_t count = 0;
-            return CLI::detail::lexical_cast(text, count) && count > 0;
+            const char* const end = text.data() + text.size();
+            const std::from_chars_result read = std::from_chars(text.data(), end, count);
+            return read.ec == std::errc() && read.ptr == end && text.front() != '0' && count <= most;
         },
-        "a number above 0");
+        "a number from 1 to " + std::to_string(most));
 }
 
 CLI::Validator positiveSeconds() {

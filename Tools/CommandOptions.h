@@ -7,6 +7,7 @@
 
 #include <CLI/CLI.hpp>
 
+#include <cstdint>
 #include <functional>
 #include <string>
 #include <vector>
@@ -20,8 +21,8 @@ namespace velmora {
 [[nodiscard]] CLI::Validator validator(std::function<bool(const std::string&)> isValid,
                                        const std::string& expected);
 [[nodiscard]] CLI::Validator oneOf(const std::vector<std::string>& words);
-/// A whole number above 0.
-[[nodiscard]] CLI::Validator positiveCount();
+/// A whole number from 1 to `most`, in decimal digits alone.
+[[nodiscard]] CLI::Validator countUpTo(std::uint64_t most);
 /// A time in seconds, at most what the event loop's timers hold, which is 24 days.
 [[nodiscard]] CLI::Validator positiveSeconds();
 

@@ -14,6 +14,7 @@
 #include <utility>
 
 #include <fcntl.h>
+#include <sys/stat.h>
 #include <unistd.h>
 
 namespace velmora {
@@ -39,7 +40,7 @@ std::string whyUnfit(Bytes message) {
 Result<std::unique_ptr<DLFWriter>> DLFWriter::create(const std::string& path, const Clock& clock) {
     if (path == "-")
         return start(std::make_unique<DescriptorFile>(STDOUT_FILENO, false), "standard output", clock);
-    const int descriptor = ::open(path.c_str(), O_WRONLY | O_CREAT | O_TRUNC | O_CLOEXEC, 0666);
+    const int descriptor = ::open(path.c_str(), O_WRONLY | O_CREAT | O_TRUNC | O_CLOEXEC, S_IRUSR | S_IWUSR);
     if (descriptor < 0)
         return Failure{"cannot create " + path + ": " + std::generic_category().message(errno)};
     return adopt(descriptor, path, clock);

@@ -3,6 +3,7 @@
 
 #include "Recording/Files/DescriptorFile.h"
 
+#include <algorithm>
 #include <cerrno>
 #include <chrono>
 #include <system_error>
@@ -26,6 +27,30 @@ int syncDescriptor(int descriptor) {
 
 } // namespace
 
+OutputFile::Change changeOf(int descriptor, const std::string& path, std::uint64_t start,
+                            std::uint64_t length) {
+    using Kind = OutputFile::Change::Kind;
+    struct stat file = {};
+    struct stat named = {};
+    if (::fstat(descriptor, &file) != 0)
+        return {};
+    const int error = ::stat(path.c_str(), &named) == 0 ? 0 : errno;
+    const bool isNamed = error == 0 && named.st_dev == file.st_dev && named.st_ino == file.st_ino;
+    // Any other error says nothing about the file: a directory above it may not be readable just now.
+    if (error == 0 && !isNamed)
+        return {Kind::Replaced, file.st_nlink == 0 ? 0 : length};
+    if (file.st_nlink == 0)
+        return {Kind::Removed, 0};
+    if (error == ENOENT || error == ENOTDIR)
+        return {Kind::Moved, length};
+    const auto size = static_cast<std::uint64_t>(file.st_size);
+    if (size < start + length)
+        return {Kind::Truncated, size - std::min(size, start)};
+    if (size > start + length)
+        return {Kind::Altered, 0};
+    return {};
+}
+
 DescriptorFile::DescriptorFile(int descriptor, bool owned) : _descriptor(descriptor), _owned(owned) {
     struct stat status = {};
     if (::fstat(_descriptor, &status) != 0 || !S_ISREG(status.st_mode))
@@ -37,6 +62,14 @@ DescriptorFile::DescriptorFile(int descriptor, bool owned) : _descriptor(descrip
     _start = static_cast<std::uint64_t>(start);
 }
 
+void DescriptorFile::watchForChanges(std::string path) {
+    if (!_regular)
+        return;
+    // At its own position a write to a file that has been truncated would leave a hole and hide the loss.
+    ::fcntl(_descriptor, F_SETFL, ::fcntl(_descriptor, F_GETFL) | O_APPEND);
+    _path = std::move(path);
+}
+
 DescriptorFile::~DescriptorFile() {
     close();
 }
@@ -44,8 +77,10 @@ DescriptorFile::~DescriptorFile() {
 OutputFile::Written DescriptorFile::write(Bytes bytes) {
     for (;;) {
         const ssize_t count = ::write(_descriptor, bytes.data(), bytes.size());
-        if (count >= 0)
+        if (count >= 0) {
+            noteWritten(static_cast<std::uint64_t>(count));
             return {static_cast<std::size_t>(count), 0};
+        }
         if (errno == EAGAIN || errno == EWOULDBLOCK) {
             pollfd writable{_descriptor, POLLOUT, 0};
             ::poll(&writable, 1, -1);
@@ -55,9 +90,32 @@ OutputFile::Written DescriptorFile::write(Bytes bytes) {
     }
 }
 
+/// An appending write leaves the position after what it wrote, wherever that was.
+void DescriptorFile::noteWritten(std::uint64_t count) {
+    if (!_path.empty() && !_misplaced) {
+        const auto end = static_cast<std::uint64_t>(::lseek(_descriptor, 0, SEEK_CUR));
+        if (end < _start + _length + count)
+            _misplaced = end - count - std::min(end - count, _start);
+    }
+    _length += count;
+}
+
+OutputFile::Change DescriptorFile::change() const {
+    if (_path.empty())
+        return {};
+    const Change change = changeOf(_descriptor, _path, _start, _length);
+    using Kind = Change::Kind;
+    const bool isNamed =
+        change.kind == Kind::None || change.kind == Kind::Truncated || change.kind == Kind::Altered;
+    return _misplaced && isNamed ? Change{Kind::Truncated, *_misplaced} : change;
+}
+
 int DescriptorFile::truncateTo(std::uint64_t size) {
     const auto end = static_cast<off_t>(_start + size);
-    return ::ftruncate(_descriptor, end) == 0 && ::lseek(_descriptor, end, SEEK_SET) == end ? 0 : errno;
+    if (::ftruncate(_descriptor, end) != 0 || ::lseek(_descriptor, end, SEEK_SET) != end)
+        return errno;
+    _length = size;
+    return 0;
 }
 
 void DescriptorFile::startSync() {

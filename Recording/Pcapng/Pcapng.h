@@ -22,6 +22,9 @@ inline constexpr std::uint32_t SystemdJournal = 9;
 inline constexpr std::uint32_t DecryptionSecrets = 10;
 inline constexpr std::uint32_t Custom = 0x00000BAD;
 inline constexpr std::uint32_t CustomNotCopied = 0x40000BAD;
+/// Of those for local use, and ours: a further part of the message before it. Its body is the part's offset
+/// in the message, 32 bits, and the part.
+inline constexpr std::uint32_t MessagePart = 0x80564C4D;
 } // namespace BlockType
 
 namespace Option {
@@ -37,6 +40,11 @@ inline constexpr std::uint16_t TimeOffset = 14;
 inline constexpr std::uint32_t byteOrderMagic = 0x1A2B3C4D;
 /// The first of the link types that are free for private use; an interface of log messages has it.
 inline constexpr std::uint16_t logMessageLinkType = 147;
+
+/// The most bytes of a packet that capture tools read: at a longer one they give up the rest of the file,
+/// whatever the interface's limit is. Blocks of types that they do not know they skip. So a longer message
+/// has its first part in its packet and the others in blocks after that.
+inline constexpr std::size_t longestPart = std::size_t{256} << 10;
 
 /// Type, length, and the length again.
 inline constexpr std::size_t blockOverhead = 12;

@@ -18,6 +18,7 @@ namespace Option = pcapng::Option;
 using Buffer = std::vector<std::uint8_t>;
 
 constexpr std::size_t packetOverhead = 32;
+constexpr std::size_t partOverhead = pcapng::blockOverhead + 4;
 constexpr std::uint8_t nanosecondResolution = 9;
 constexpr std::string_view application = VELMORA_RECORDING_APPLICATION;
 
@@ -56,7 +57,24 @@ std::uint32_t u32At(Bytes blocks, std::size_t offset) {
 }
 
 constexpr std::size_t lengthOffset = 4;
-constexpr std::size_t capturedOffset = 20;
+constexpr std::size_t originalOffset = 24;
+
+/// The length of the first block, and of those with the rest of its message.
+std::size_t firstLength(Bytes blocks) {
+    std::size_t length = u32At(blocks, lengthOffset);
+    while (length < blocks.size() && u32At(blocks, length) == BlockType::MessagePart)
+        length += u32At(blocks, length + lengthOffset);
+    return length;
+}
+
+void appendPart(Buffer& buffer, std::size_t offset, Bytes part) {
+    const auto length = static_cast<std::uint32_t>(partOverhead + pcapng::padded(part.size()));
+    put32(buffer, BlockType::MessagePart);
+    put32(buffer, length);
+    put32(buffer, static_cast<std::uint32_t>(offset));
+    putPadded(buffer, part);
+    put32(buffer, length);
+}
 
 } // namespace
 
@@ -91,27 +109,31 @@ void appendInterface(Buffer& buffer, std::string_view technology) {
 
 void appendPacket(Buffer& buffer, Time time, Bytes message) {
     const auto stamp = static_cast<std::uint64_t>(std::max<std::int64_t>(time.time_since_epoch().count(), 0));
-    const auto size = static_cast<std::uint32_t>(message.size());
-    const auto length = static_cast<std::uint32_t>(packetSize(message.size()));
+    const Bytes first = message.first(std::min(message.size(), pcapng::longestPart));
+    const auto length = static_cast<std::uint32_t>(packetOverhead + pcapng::padded(first.size()));
     put32(buffer, BlockType::EnhancedPacket);
     put32(buffer, length);
     put32(buffer, 0); // the interface
     put32(buffer, static_cast<std::uint32_t>(stamp >> 32));
     put32(buffer, static_cast<std::uint32_t>(stamp));
-    put32(buffer, size);
-    put32(buffer, size);
-    putPadded(buffer, message);
+    put32(buffer, static_cast<std::uint32_t>(first.size()));
+    put32(buffer, static_cast<std::uint32_t>(message.size()));
+    putPadded(buffer, first);
     put32(buffer, length);
+    for (std::size_t offset = first.size(); offset < message.size(); offset += pcapng::longestPart)
+        appendPart(buffer, offset,
+                   message.subspan(offset, std::min(message.size() - offset, pcapng::longestPart)));
 }
 
 std::size_t packetSize(std::size_t messageSize) {
-    return packetOverhead + pcapng::padded(messageSize);
+    const std::size_t parts = messageSize == 0 ? 0 : (messageSize - 1) / pcapng::longestPart;
+    return packetOverhead + parts * partOverhead + pcapng::padded(messageSize);
 }
 
 std::size_t completeBlocks(Bytes blocks, std::size_t length) {
     std::size_t whole = 0;
     while (whole < blocks.size()) {
-        const std::size_t next = whole + u32At(blocks.subspan(whole), lengthOffset);
+        const std::size_t next = whole + firstLength(blocks.subspan(whole));
         if (next > length)
             break;
         whole = next;
@@ -121,11 +143,11 @@ std::size_t completeBlocks(Bytes blocks, std::size_t length) {
 
 PacketCount countPackets(Bytes blocks) {
     PacketCount count;
-    for (; !blocks.empty(); blocks = blocks.subspan(u32At(blocks, lengthOffset))) {
+    for (; !blocks.empty(); blocks = blocks.subspan(firstLength(blocks))) {
         if (u32At(blocks, 0) != BlockType::EnhancedPacket)
             continue;
         ++count.messages;
-        count.bytes += u32At(blocks, capturedOffset);
+        count.bytes += u32At(blocks, originalOffset);
     }
     return count;
 }

@@ -12,7 +12,8 @@
 #include <vector>
 
 /// The blocks of a recording as they are written: little-endian pcapng, one section with one interface (link
-/// type 147, nanoseconds, the technology as its name), then one Enhanced Packet Block a message.
+/// type 147, nanoseconds, the technology as its name), then one Enhanced Packet Block a message, with the
+/// rest of a long one in blocks after it.
 namespace velmora::pcapngBlocks {
 
 /// Adds the section header.
@@ -21,15 +22,16 @@ void appendSection(std::vector<std::uint8_t>& buffer);
 /// Adds the interface description. Precondition: `technology` has at most 65535 bytes.
 void appendInterface(std::vector<std::uint8_t>& buffer, std::string_view technology);
 
-/// Adds a message's block. A time before 1970 cannot be written and becomes 1970-01-01. Precondition: the
-/// message is not above `maximumMessageSize`.
+/// Adds a message's block, and those of its further parts where it is long (see pcapng::longestPart). A time
+/// before 1970 cannot be written and becomes 1970-01-01. Precondition: the message is not above
+/// `maximumMessageSize`.
 void appendPacket(std::vector<std::uint8_t>& buffer, Time time, Bytes message);
 
-/// The length of a message's block.
+/// The length of a message's blocks.
 [[nodiscard]] std::size_t packetSize(std::size_t messageSize);
 
 /// Of blocks as the functions above make them: the length of those that lie wholly within the first `length`
-/// bytes.
+/// bytes, a message's blocks counting as one.
 [[nodiscard]] std::size_t completeBlocks(Bytes blocks, std::size_t length);
 
 struct PacketCount {

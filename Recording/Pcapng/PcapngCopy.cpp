@@ -3,6 +3,7 @@
 
 #include "Recording/Pcapng/PcapngCopy.h"
 
+#include "Recording/Pcapng/ByteReader.h"
 #include "Recording/Pcapng/OptionReader.h"
 #include "Recording/Pcapng/Pcapng.h"
 
@@ -16,6 +17,8 @@ using Buffer = std::vector<std::uint8_t>;
 
 constexpr std::size_t sectionLengthOffset = 16;
 constexpr std::size_t interfaceOptionsOffset = 16;
+constexpr std::size_t capturedOffset = 20;
+constexpr std::size_t packetDataOffset = 28;
 
 /// Appends a number in the block's byte order.
 void put(Buffer& buffer, std::uint32_t value, std::size_t width, bool bigEndian) {
@@ -30,6 +33,17 @@ void putOption(Buffer& buffer, std::uint16_t code, Bytes value, bool bigEndian) 
     put(buffer, static_cast<std::uint32_t>(value.size()), 2, bigEndian);
     buffer.insert(buffer.end(), value.begin(), value.end());
     buffer.resize(buffer.size() + pcapng::padded(value.size()) - value.size());
+}
+
+/// Ends the block that begins there: writes its length, in both places.
+void closeBlock(Buffer& buffer, std::size_t begin, bool bigEndian) {
+    put(buffer, static_cast<std::uint32_t>(buffer.size() - begin + 4), 4, bigEndian);
+    std::copy(buffer.end() - 4, buffer.end(), buffer.begin() + static_cast<std::ptrdiff_t>(begin) + 4);
+}
+
+void append(Buffer& buffer, Bytes bytes) {
+    buffer.insert(buffer.end(), bytes.begin(), bytes.end());
+    buffer.resize(pcapng::padded(buffer.size()));
 }
 
 } // namespace
@@ -56,9 +70,34 @@ Buffer renamedInterface(const BlockReader::Block& block, std::string_view name) 
         if (option->code != pcapng::Option::InterfaceName)
             putOption(copy, option->code, option->value, block.bigEndian);
     putOption(copy, pcapng::Option::End, {}, block.bigEndian);
-    const auto length = static_cast<std::uint32_t>(copy.size() + 4);
-    put(copy, length, 4, block.bigEndian);
-    std::copy(copy.end() - 4, copy.end(), copy.begin() + 4);
+    closeBlock(copy, 0, block.bigEndian);
+    return copy;
+}
+
+Buffer readablePacket(const BlockReader::Block& block) {
+    const std::size_t captured = block.type == pcapng::BlockType::EnhancedPacket
+                                     ? ByteReader(block.bytes, block.bigEndian).u32(capturedOffset)
+                                     : 0;
+    if (captured <= pcapng::longestPart)
+        return {block.bytes.begin(), block.bytes.end()};
+    const Bytes message = block.bytes.subspan(packetDataOffset, captured);
+    const Bytes options =
+        block.bytes.first(block.length - 4).subspan(packetDataOffset + pcapng::padded(captured));
+    Buffer copy;
+    append(copy, block.bytes.first(capturedOffset));
+    put(copy, pcapng::longestPart, 4, block.bigEndian);
+    put(copy, static_cast<std::uint32_t>(captured), 4, block.bigEndian);
+    append(copy, message.first(pcapng::longestPart));
+    append(copy, options);
+    closeBlock(copy, 0, block.bigEndian);
+    for (std::size_t offset = pcapng::longestPart; offset < captured; offset += pcapng::longestPart) {
+        const std::size_t begin = copy.size();
+        put(copy, pcapng::BlockType::MessagePart, 4, block.bigEndian);
+        put(copy, 0, 4, block.bigEndian); // the length, which follows
+        put(copy, static_cast<std::uint32_t>(offset), 4, block.bigEndian);
+        append(copy, message.subspan(offset, std::min(captured - offset, pcapng::longestPart)));
+        closeBlock(copy, begin, block.bigEndian);
+    }
     return copy;
 }
 

@@ -23,4 +23,8 @@ namespace velmora::pcapngCopy {
 [[nodiscard]] std::vector<std::uint8_t> renamedInterface(const BlockReader::Block& block,
                                                          std::string_view name);
 
+/// The packet as capture tools read it: a message that is too long for them in one block is put into several
+/// (see pcapng::longestPart). All others stay as they are.
+[[nodiscard]] std::vector<std::uint8_t> readablePacket(const BlockReader::Block& block);
+
 } // namespace velmora::pcapngCopy

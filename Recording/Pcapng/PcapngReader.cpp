@@ -195,8 +195,11 @@ void PcapngReader::readMessage(const Block& block, std::optional<LoggedMessage>&
     if (isOther)
         passOn(block);
     const std::size_t room = block.length - 4;
+    const bool hasParts =
+        block.type == BlockType::EnhancedPacket && JoinedMessage::hasParts(packet.captured, packet.original);
     const bool whole = packet.offset <= room && packet.captured <= room - packet.offset &&
-                       packet.captured == packet.original && packet.captured <= maximumMessageSize;
+                       (packet.captured == packet.original || hasParts) &&
+                       packet.captured <= maximumMessageSize;
     std::optional<Time> time;
     if (interface != nullptr && interface->use == Use::Messages && whole && !isOther)
         time = packet.hasStamp ? interface->description.time(packet.stamp) : _lastTime;
@@ -209,14 +212,38 @@ void PcapngReader::readMessage(const Block& block, std::optional<LoggedMessage>&
     const std::size_t options = packet.offset + pcapng::padded(packet.captured);
     if (block.type != BlockType::SimplePacket && options < room)
         readComments(block, options, Comment::About::Message, number);
-    _messageBlock = &block;
     _lastTime = *time;
     LoggedMessage& made = message.emplace();
     made.time = *time;
-    made.message = _blocks.part(packet.offset, packet.captured);
     made.number = number;
     made.offset = block.offset;
     made.technology = interface->technology;
+    if (hasParts) {
+        const Block first = block; // which is another after the next is read
+        if (!join(block, packet)) {
+            message.reset();
+            addLossOf(first, number, packetProblem(packet, first));
+            return;
+        }
+        made.message = _joined->takeMessage();
+        _messageBlock = &_joined->block();
+    } else {
+        made.message = _blocks.part(packet.offset, packet.captured);
+        _messageBlock = &block;
+    }
+}
+
+/// Reads the blocks with the other parts of the packet's message. False if one is missing.
+bool PcapngReader::join(const Block& block, const Packet& packet) {
+    _joined.emplace(block, block.bytes.subspan(packet.offset, packet.captured), packet.original);
+    while (!_joined->isComplete()) {
+        const Block* const next = nextBlock();
+        if (next && _joined->add(*next))
+            continue;
+        _waiting = next;
+        return false;
+    }
+    return true;
 }
 
 /// Fields that the block is too short for read as 0, and its bytes then begin past its end.

@@ -7,6 +7,7 @@
 #include "Recording/MessageReader.h"
 #include "Recording/Pcapng/BlockReader.h"
 #include "Recording/Pcapng/InterfaceDescription.h"
+#include "Recording/Pcapng/JoinedMessage.h"
 
 #include <cstddef>
 #include <cstdint>
@@ -64,8 +65,8 @@ public:
     /// link types and technologies. Call it before the first `next`; it gets those that have been read to
     /// open the file at once.
     void setOtherBlocks(std::function<void(const Block&)> otherBlocks);
-    /// The block of the message that `next` last returned, until the next call. Precondition: it returned
-    /// one.
+    /// The block of the message that `next` last returned, with the bytes of all where it has several, until
+    /// the next call. Precondition: it returned one.
     [[nodiscard]] const Block& block() const { return *_messageBlock; }
 
 private:
@@ -98,6 +99,7 @@ private:
     void passOn(const Block& block);
     /// Reads a packet's message, unless the packet is ignored or a loss.
     void readMessage(const Block& block, std::optional<LoggedMessage>& message);
+    [[nodiscard]] bool join(const Block& block, const Packet& packet);
     [[nodiscard]] Packet packetOf(const Block& block) const;
     [[nodiscard]] std::string packetProblem(const Packet& packet, const Block& block) const;
     void addLossOf(const Block& block, std::uint64_t number, std::string reason);
@@ -105,6 +107,7 @@ private:
     BlockReader _blocks;
     const Block* _waiting = nullptr; ///< the packet that `open` stopped at
     const Block* _messageBlock = nullptr;
+    std::optional<JoinedMessage> _joined; ///< the last one of several blocks
     /// Copies of the blocks that `open` read, until there is somewhere to pass them on to.
     std::vector<std::pair<Block, std::vector<std::uint8_t>>> _head;
     std::size_t _headSize = 0;

@@ -13,6 +13,7 @@
 #include <utility>
 
 #include <fcntl.h>
+#include <sys/stat.h>
 #include <unistd.h>
 
 namespace velmora {
@@ -33,7 +34,7 @@ Result<std::unique_ptr<PcapngWriter>> PcapngWriter::create(const std::string& pa
                                                            std::string_view technology) {
     if (path == "-")
         return start(std::make_unique<DescriptorFile>(STDOUT_FILENO, false), "standard output", technology);
-    const int descriptor = ::open(path.c_str(), O_WRONLY | O_CREAT | O_TRUNC | O_CLOEXEC, 0666);
+    const int descriptor = ::open(path.c_str(), O_WRONLY | O_CREAT | O_TRUNC | O_CLOEXEC, S_IRUSR | S_IWUSR);
     if (descriptor < 0)
         return Failure{"cannot create " + path + ": " + std::generic_category().message(errno)};
     return adopt(descriptor, path, technology);
@@ -51,17 +52,17 @@ Result<std::unique_ptr<PcapngWriter>> PcapngWriter::start(std::unique_ptr<Output
     if (shortName.size() > maximumTechnology)
         return Failure{"technology name of " + std::to_string(shortName.size()) + " bytes, wanted at most " +
                        std::to_string(maximumTechnology)};
-    pcapngBlocks::appendSection(writer->_buffer);
-    pcapngBlocks::appendInterface(writer->_buffer, shortName);
+    pcapngBlocks::appendSection(writer->_head);
+    pcapngBlocks::appendInterface(writer->_head, shortName);
+    writer->_buffer = writer->_head;
+    writer->_buffer.reserve(2 * flushThreshold);
     if (const Result<Done> written = writer->flush(); !written && !writer->hasTemporaryError())
         return Failure{written.reason()};
     return writer;
 }
 
 PcapngWriter::PcapngWriter(std::unique_ptr<OutputFile> file, std::string name)
-    : _file(std::move(file)), _name(std::move(name)) {
-    _buffer.reserve(2 * flushThreshold);
-}
+    : _file(std::move(file)), _name(std::move(name)) {}
 
 PcapngWriter::~PcapngWriter() {
     const Result<Done> closed = close();
@@ -93,6 +94,8 @@ Result<Done> PcapngWriter::append(Time time, Bytes message) {
 Result<Done> PcapngWriter::flush() {
     if (_permanentError)
         return *_permanentError;
+    if (_change.kind != OutputFile::Change::Kind::None || (!_temporaryError && noteChange()))
+        return outcome();
     // What a temporary failure has left after the last complete block is cut off first.
     if (const int error = _temporaryError ? _file->truncateTo(_end) : 0; error != 0) {
         noteFailure("write", error);
@@ -107,6 +110,9 @@ Result<Done> PcapngWriter::flush() {
         _end += written.bytes;
         rest = rest.subspan(written.bytes);
     }
+    // Nothing is discarded before it is known to be where it belongs.
+    if (noteChange())
+        return outcome();
     _temporaryError.reset();
     _dropping = false;
     if (!_keepsUnsynced || written() > maximumUnsynced)
@@ -127,6 +133,23 @@ Result<Done> PcapngWriter::sync() {
         _syncing = _end;
     }
     return Done{};
+}
+
+Result<Done> PcapngWriter::continueIn(std::unique_ptr<OutputFile> file, std::string name) {
+    static_cast<void>(_file->close()); // what it may report is in the new file, or was in the old one
+    std::size_t kept = pcapngBlocks::completeBlocks(_buffer, intactInBuffer());
+    if (_base < _head.size())
+        kept = std::max(kept, static_cast<std::size_t>(_head.size() - _base));
+    _buffer.erase(_buffer.begin(), _buffer.begin() + static_cast<std::ptrdiff_t>(kept));
+    _messagesBefore = _messages - pcapngBlocks::countPackets(_buffer).messages;
+    _buffer.insert(_buffer.begin(), _head.begin(), _head.end());
+    _base = _end = _syncing = _synced = 0;
+    _syncIsUnderWay = false;
+    _change = {};
+    _temporaryError.reset();
+    _file = std::move(file);
+    _name = std::move(name);
+    return flush();
 }
 
 Result<Done> PcapngWriter::close() {
@@ -179,6 +202,20 @@ bool PcapngWriter::applySyncResult(int error, std::uint64_t end) {
     if (end > _base)
         discardFront(static_cast<std::size_t>(end - _base));
     return true;
+}
+
+bool PcapngWriter::noteChange() {
+    _change = _file->change();
+    if (_change.kind == OutputFile::Change::Kind::None)
+        return false;
+    // What is not in the file any more is not saved.
+    _end = std::min(_end, _base + pcapngBlocks::completeBlocks(_buffer, intactInBuffer()));
+    _temporaryError = Failure{(_name + " ").append(OutputFile::describe(_change.kind))};
+    return true;
+}
+
+std::size_t PcapngWriter::intactInBuffer() const {
+    return static_cast<std::size_t>(_change.intact - std::min(_change.intact, _base));
 }
 
 void PcapngWriter::noteFailure(const char* operation, int error) {

@@ -30,6 +30,9 @@ namespace velmora {
 /// returns the failure, and each `flush` and `sync` retries. After a permanent failure every call returns it
 /// and nothing more is written. `hasTemporaryError` distinguishes the two.
 ///
+/// A file that others have changed (see OutputFile::Change) is a temporary failure as well: messages are
+/// queued until `continueIn` supplies another file.
+///
 /// Owns its file; destroying it closes it as `close` does, but reports no failure. Main thread only.
 class PcapngWriter {
 public:
@@ -60,6 +63,10 @@ public:
     Result<Done> flush();
     /// Flushes, and starts to sync the file in the background: a later call returns the result.
     Result<Done> sync();
+    /// Continues in another file, of which nothing has been written: closes the present one and writes, after
+    /// a head, what was not in it or has been removed from it with its end, as far as that is still in
+    /// memory.
+    Result<Done> continueIn(std::unique_ptr<OutputFile> file, std::string name);
     /// Flushes, syncs and closes the file. A second call does nothing.
     Result<Done> close();
 
@@ -73,6 +80,10 @@ public:
     [[nodiscard]] bool hasTemporaryError() const { return _temporaryError.has_value(); }
     /// Whether messages are being dropped.
     [[nodiscard]] bool isDropping() const { return _dropping; }
+    /// What others have done to the file, which keeps it from being written.
+    [[nodiscard]] OutputFile::Change::Kind change() const { return _change.kind; }
+    /// Of `messages()`, those that were written to this file, or are to be.
+    [[nodiscard]] std::uint64_t messagesOfFile() const { return _messages - _messagesBefore; }
 
 private:
     PcapngWriter(std::unique_ptr<OutputFile> file, std::string name);
@@ -87,6 +98,10 @@ private:
     [[nodiscard]] bool syncNow();
     /// Takes note that the file has been synced up to `end`, or that syncing failed. False if it failed.
     [[nodiscard]] bool applySyncResult(int error, std::uint64_t end);
+    /// Makes it a temporary failure if others have changed the file. Whether they have.
+    [[nodiscard]] bool noteChange();
+    /// How much of the buffer is still in a file that others have changed.
+    [[nodiscard]] std::size_t intactInBuffer() const;
     /// Makes the error a temporary failure where it may pass, else the permanent one.
     void noteFailure(const char* operation, int error);
     [[nodiscard]] Failure failureOf(const char* operation, int error) const;
@@ -95,6 +110,7 @@ private:
 
     std::unique_ptr<OutputFile> _file; ///< null when closed
     std::string _name;
+    std::vector<std::uint8_t> _head;   ///< section header and interface, for a file to continue in
     std::vector<std::uint8_t> _buffer; ///< complete blocks: unsynced ones, then those not yet in the file
     std::uint64_t _base = 0;           ///< where in the file the buffer begins
     std::uint64_t _end = 0;            ///< how long the file is
@@ -104,7 +120,9 @@ private:
     bool _keepsUnsynced = false; ///< `sync` is in use
     bool _dropping = false;
     std::uint64_t _messages = 0;
+    std::uint64_t _messagesBefore = 0; ///< in earlier files
     std::uint64_t _dropped = 0;
+    OutputFile::Change _change;             ///< by others; a temporary failure
     std::optional<Failure> _temporaryError; ///< temporary
     std::optional<Failure> _permanentError; ///< permanent
 };

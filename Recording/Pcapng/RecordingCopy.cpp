@@ -27,7 +27,7 @@ RecordingCopy::RecordingCopy(PcapngReader& reader, std::unique_ptr<OutputFile> f
 }
 
 Result<Done> RecordingCopy::addMessage() {
-    add(_reader.block().bytes);
+    add(pcapngCopy::readablePacket(_reader.block()));
     return _failure ? Result<Done>(*_failure) : Done{};
 }
 

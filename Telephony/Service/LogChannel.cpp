@@ -3,6 +3,8 @@
 
 #include "Telephony/Service/LogChannel.h"
 
+#include "Platform/TelephonyService.h"
+
 #include <utility>
 
 namespace velmora {
@@ -20,6 +22,11 @@ void LogChannel::send(const Data& message) {
     if (!isStreaming() || !_filter.passes(message.bytes()))
         return;
     _application->post(0, message);
+}
+
+void LogChannel::sendEnd() {
+    if (isStreaming())
+        _application->post(vox::sourceEndedMessage, Data());
 }
 
 bool LogChannel::hasRoom() {

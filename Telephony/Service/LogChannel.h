@@ -37,6 +37,8 @@ public:
     /// Sends the message where the channel streams and the filter passes it. Never blocks: if the client is
     /// slow its connection drops the oldest messages and logs how many.
     void send(const Data& message);
+    /// Tells a client that streams that the source has ended.
+    void sendEnd();
     /// Whether the client's queue has room; true for a client that is not waited for any more.
     [[nodiscard]] bool hasRoom();
 

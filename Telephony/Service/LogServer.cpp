@@ -195,6 +195,7 @@ void LogServer::removeClosedChannels() {
     if (!_sourceRuns || streaming)
         return;
     _sourceRuns = false;
+    _sourceEnded = false;
     _source.stop();
     _latestExtra.clear();
 }
@@ -254,6 +255,14 @@ void LogServer::startStreaming(LogChannel& channel, const Dictionary& command) {
     }
     for (const auto& [code, message] : _latestExtra)
         channel.send(message);
+    if (_sourceEnded)
+        channel.sendEnd();
+}
+
+void LogServer::sourceEnded() {
+    _sourceEnded = true;
+    for (const ChannelRef& channel : _channels)
+        channel->sendEnd();
 }
 
 void LogServer::receive(const Data& message) {

@@ -69,6 +69,7 @@ private:
 
     void receive(const Data& message) override;
     [[nodiscard]] bool hasRoom() const override;
+    void sourceEnded() override;
 
     [[nodiscard]] Value createChannel(const Data& request);
     /// Logs why the request is refused; the reply to it.
@@ -95,6 +96,7 @@ private:
     std::uint64_t _channelsMade = 0;
     bool _sourceRuns = false;
     bool _watchesIdle = false;                  ///< a check of idle channels is due
+    bool _sourceEnded = false;                  ///< its present run has no more messages
     std::map<std::uint16_t, Data> _latestExtra; ///< of the source's present run, by code
     /// Queued tasks hold it weakly: they do nothing after the server's destruction.
     std::shared_ptr<bool> _alive = std::make_shared<bool>(true);

@@ -19,6 +19,8 @@ public:
     /// False while the queue of a client that still reads is full. A source with a pace of its own ignores
     /// it; one that runs as fast as possible waits.
     [[nodiscard]] virtual bool hasRoom() const = 0;
+    /// The source has sent its last message, and sends no more unless it is started again.
+    virtual void sourceEnded() {}
 };
 
 /// A source of log messages: a synthetic drive, a recording, a modem. Runs on the main queue; sends a bounded

@@ -76,8 +76,10 @@ void MessagePlayer::wake(const std::shared_ptr<Run>& run) {
     for (int sent = 0; sent < batch; ++sent) {
         if (!run->event)
             run->event = run->next();
-        if (!run->event)
-            return; // the end
+        if (!run->event) {
+            run->sink.sourceEnded();
+            return;
+        }
         const double ahead_ns = static_cast<double>(run->event->offset.count()) - run->position_ns;
         if (paced && ahead_ns > 0) {
             const double wait_ns = std::min(ahead_ns / run->speed, static_cast<double>(longestSleep.count()));

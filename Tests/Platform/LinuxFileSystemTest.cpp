@@ -88,7 +88,12 @@ TEST_F(LinuxFileSystemTest, StandardLogDirectoryIsMadeANamedOneIsNot) {
     const LinuxFileSystem standard({directory.path(), {}});
     EXPECT_TRUE(standard.makeStandardLogDirectory());
     EXPECT_TRUE(std::filesystem::is_directory(directory / "state/velmora"));
+    for (const char* made : {"state", "state/velmora"})
+        EXPECT_EQ(std::filesystem::status(directory / made).permissions(), std::filesystem::perms(0700));
+    std::filesystem::permissions(directory / "state/velmora", std::filesystem::perms(0750));
     EXPECT_TRUE(standard.makeStandardLogDirectory()); // there already
+    EXPECT_EQ(std::filesystem::status(directory / "state/velmora").permissions(),
+              std::filesystem::perms(0750));
 
     const LinuxFileSystem named({{}, directory / "named"});
     EXPECT_TRUE(named.makeStandardLogDirectory());
@@ -111,6 +116,7 @@ TEST_F(LinuxFileSystemTest, FileIsWrittenInPlace) {
     ASSERT_TRUE(files.writeDirectly(path, "next"));
     EXPECT_EQ(content("out"), "next");
     EXPECT_EQ(content("the same file"), "next"); // no other file was put in its place
+    EXPECT_EQ(std::filesystem::status(path).permissions(), std::filesystem::perms(0600));
     const auto failed = files.writeDirectly((directory / "none/out").string(), "x");
     ASSERT_FALSE(failed);
     EXPECT_EQ(failed.reason(), "cannot be opened for writing: No such file or directory");

@@ -8,7 +8,10 @@
 
 #include <chrono>
 #include <csignal>
+#include <cstdint>
+#include <filesystem>
 #include <fstream>
+#include <functional>
 #include <iterator>
 #include <string>
 #include <thread>
@@ -112,6 +115,79 @@ TEST_F(DescriptorFileTest, SyncIsWaitedForElsewhere) {
     EXPECT_EQ(file.sync(), 0);
     file.startSync();
     EXPECT_EQ(file.close(), 0) << "closing waits for it";
+}
+
+using Kind = OutputFile::Change::Kind;
+
+TEST_F(DescriptorFileTest, ChangesByOthersAreNoticed) {
+    struct Case {
+        const char* name;
+        std::function<void(const std::string& path)> change;
+        Kind kind;
+        std::uint64_t intact;
+    };
+    namespace fs = std::filesystem;
+    const Case cases[] = {
+        {"nothing", [](const std::string&) {}, Kind::None, 0},
+        {"removed", [](const std::string& path) { fs::remove(path); }, Kind::Removed, 0},
+        {"moved", [](const std::string& path) { fs::rename(path, path + ".old"); }, Kind::Moved, 6},
+        {"replaced",
+         [](const std::string& path) {
+             std::ofstream(path + ".new") << "abcabc";
+             fs::rename(path + ".new", path);
+         },
+         Kind::Replaced, 0},
+        {"moved and replaced",
+         [](const std::string& path) {
+             fs::rename(path, path + ".old");
+             std::ofstream(path) << "abcabc";
+         },
+         Kind::Replaced, 6},
+        {"truncated", [](const std::string& path) { fs::resize_file(path, 2); }, Kind::Truncated, 2},
+        {"emptied", [](const std::string& path) { std::ofstream(path).close(); }, Kind::Truncated, 0},
+        {"written to", [](const std::string& path) { std::ofstream(path, std::ios::app) << "x"; },
+         Kind::Altered, 0},
+    };
+    for (const Case& each : cases) {
+        fs::remove(_path);
+        DescriptorFile file(open(O_WRONLY | O_CREAT), true);
+        file.watchForChanges(_path);
+        ASSERT_EQ(file.write(_three.bytes()).bytes, 3U);
+        ASSERT_EQ(file.write(_three.bytes()).bytes, 3U);
+        ASSERT_EQ(file.change().kind, Kind::None) << each.name;
+        each.change(_path);
+        EXPECT_EQ(file.change().kind, each.kind) << each.name;
+        EXPECT_EQ(file.change().intact, each.intact) << each.name;
+    }
+}
+
+TEST_F(DescriptorFileTest, TruncationBeforeAWriteIsNoticedWhateverTheLengthIsAfterwards) {
+    DescriptorFile file(open(O_WRONLY | O_CREAT), true);
+    file.watchForChanges(_path);
+    ASSERT_EQ(file.write(_three.bytes()).bytes, 3U);
+    std::filesystem::resize_file(_path, 1);
+    ASSERT_EQ(file.write(_three.bytes()).bytes, 3U);
+    EXPECT_EQ(content(), "aabc") << "no hole";
+    std::filesystem::resize_file(_path, 6); // as long as it should be
+    EXPECT_EQ(file.change().kind, Kind::Truncated);
+    EXPECT_EQ(file.change().intact, 1U);
+}
+
+TEST_F(DescriptorFileTest, OwnTruncationIsNoChange) {
+    DescriptorFile file(open(O_WRONLY | O_CREAT), true);
+    file.watchForChanges(_path);
+    ASSERT_EQ(file.write(_three.bytes()).bytes, 3U);
+    ASSERT_EQ(file.truncateTo(1), 0);
+    EXPECT_EQ(file.change().kind, Kind::None);
+    ASSERT_EQ(file.write(_three.bytes()).bytes, 3U);
+    EXPECT_EQ(file.change().kind, Kind::None);
+    EXPECT_EQ(content(), "aabc");
+}
+
+TEST_F(DescriptorFileTest, FileThatIsNotWatchedHasNoChanges) {
+    DescriptorFile file(open(O_WRONLY | O_CREAT), true);
+    std::filesystem::remove(_path);
+    EXPECT_EQ(file.change().kind, Kind::None);
 }
 
 TEST_F(DescriptorFileTest, SyncOfAPipeIsAnError) {

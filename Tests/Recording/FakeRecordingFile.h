@@ -23,6 +23,7 @@ struct FakeOutputFile {
     std::size_t longestWrite = SIZE_MAX;
     int cutError = 0;
     bool isRegular = true;
+    OutputFile::Change change; ///< by others
 
     std::size_t syncsStarted = 0;
     std::optional<int> syncOutcome; ///< of the sync under way; the test sets it
@@ -46,6 +47,7 @@ public:
         return {count, 0};
     }
     [[nodiscard]] bool isRegular() const override { return _medium.isRegular; }
+    [[nodiscard]] Change change() const override { return _medium.change; }
     int truncateTo(std::uint64_t size) override {
         if (_medium.cutError != 0)
             return _medium.cutError;

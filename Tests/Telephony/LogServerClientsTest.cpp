@@ -9,6 +9,8 @@
 
 #include <gmock/gmock.h>
 
+#include <algorithm>
+
 namespace velmora {
 namespace {
 
@@ -17,6 +19,27 @@ using ::testing::ElementsAre;
 using ::testing::IsEmpty;
 
 using LogServerClientsTest = LogServerTest;
+
+TEST_F(LogServerClientsTest, EveryClientIsToldThatTheSourceHasEnded) {
+    listen();
+    const auto ends = [this](const std::string& application) {
+        return std::count_if(ports.sent().begin(), ports.sent().end(), [&](const auto& sent) {
+            return sent.port == application && sent.id == 1 && sent.payload.size() == 0;
+        });
+    };
+    const std::string first = createChannel("com.velmora.first");
+    const std::string idle = createChannel("com.velmora.idle");
+    stream(first);
+    source.sink->receive(hex("01 02"));
+    EXPECT_EQ(ends("com.velmora.first"), 0);
+    source.sink->sourceEnded();
+    EXPECT_EQ(ends("com.velmora.first"), 1);
+    EXPECT_EQ(ends("com.velmora.idle"), 0) << "it gets no messages";
+    const std::string late = createChannel("com.velmora.late");
+    stream(late);
+    EXPECT_EQ(ends("com.velmora.late"), 1) << "there is nothing to wait for";
+    EXPECT_EQ(ends("com.velmora.first"), 1);
+}
 
 TEST_F(LogServerClientsTest, closesTheChannelOfAClosedClient) {
     listen();

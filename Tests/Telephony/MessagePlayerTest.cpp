@@ -64,8 +64,10 @@ TEST_F(MessagePlayerTest, sendsEachMessageInItsTime) {
     EXPECT_EQ(sink.messages.size(), 3U);
     queue.advance(2ms);
     EXPECT_EQ(sink.messages.size(), 4U);
+    EXPECT_EQ(sink.ends, 0);
     queue.advance(1h);
     EXPECT_EQ(sink.messages.size(), 5U);
+    EXPECT_EQ(sink.ends, 1);
     EXPECT_EQ(queue.delayedCount(), 0U) << "nothing is left to do at the end";
 }
 

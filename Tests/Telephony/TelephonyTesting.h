@@ -22,6 +22,7 @@ class CollectingSink final : public LogSink {
 public:
     std::vector<Data> messages;
     bool room = true;
+    int ends = 0;                 ///< how often the source has said that it ended
     std::function<void()> onTake; ///< runs after each message
 
     void receive(const Data& message) override {
@@ -30,6 +31,7 @@ public:
             onTake();
     }
     [[nodiscard]] bool hasRoom() const override { return room; }
+    void sourceEnded() override { ++ends; }
 };
 
 /// The dictionary as an XML property list.

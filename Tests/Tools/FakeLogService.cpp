@@ -53,6 +53,11 @@ void FakeLogService::send(const Data& message) {
         client->post(0, message);
 }
 
+void FakeLogService::sendEnd() {
+    for (const auto& client : _clients)
+        client->post(1, Data());
+}
+
 bool FakeLogService::isAllTaken() const {
     return std::all_of(_clients.begin(), _clients.end(),
                        [](const auto& client) { return client->waitingMessages() == 0; });

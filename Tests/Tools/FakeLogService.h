@@ -25,6 +25,8 @@ public:
     /// Clients that have sent their start command.
     [[nodiscard]] std::size_t streaming() const { return _clients.size(); }
     void send(const Data& message);
+    /// Says that no more messages follow.
+    void sendEnd();
     /// Whether every client has taken all that was sent.
     [[nodiscard]] bool isAllTaken() const;
 

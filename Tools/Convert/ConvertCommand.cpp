@@ -10,11 +10,13 @@
 #include "Tools/Decode/Refreshes.h"
 #include "Tools/ExitStatus.h"
 #include "Tools/Messages/TechnologyChoice.h"
+#include "Tools/OverwriteTarget.h"
 #include "Tools/Report.h"
 
 #include <algorithm>
 #include <climits>
 #include <csignal>
+#include <filesystem>
 #include <memory>
 #include <optional>
 #include <string_view>
@@ -26,7 +28,7 @@ namespace velmora {
 
 namespace {
 
-constexpr mode_t newFileMode = 0666;
+constexpr mode_t newFileMode = S_IRUSR | S_IWUSR;
 
 /// The name of the file that a signal which ends the program has to remove; a signal handler needs it global.
 char nameToRemove[PATH_MAX];
@@ -91,14 +93,15 @@ std::optional<std::uint64_t> refreshesOf(const std::string& file, const Conversi
 }
 
 /// Whether all of the input is in the output now.
-bool convert(const ConvertOptions& options, MessageReader& reader, const std::string& title) {
+bool convert(const ConvertOptions& options, const std::filesystem::path& target, MessageReader& reader,
+             const std::string& title) {
     // Before the output, so that an allocation that fails never leaves one on the disk.
     AtomicFile* made = nullptr;
     WorkContext context(title, [&made] {
         if (made)
             made->discard();
     });
-    Result<AtomicFile> output = AtomicFile::create(options.out, newFileMode);
+    Result<AtomicFile> output = AtomicFile::create(target, newFileMode);
     if (!output) {
         report(options.out + ": " + output.reason());
         return false;
@@ -136,13 +139,18 @@ int runConvert(const ConvertOptions& options) {
         report(reason);
         return ExitStatus::BadInput;
     }
+    const Result<std::filesystem::path> target = overwriteTarget(options.out);
+    if (!target) {
+        report(target.reason());
+        return ExitStatus::BadInput;
+    }
     const std::string title = fileTitle(options.file);
     const Result<std::unique_ptr<MessageReader>> reader = openMessages(options.file);
     if (!reader) {
         report(title + ": " + reader.reason());
         return ExitStatus::BadInput;
     }
-    const bool converted = convert(options, **reader, title);
+    const bool converted = convert(options, *target, **reader, title);
     const bool whole = reportLosses(**reader, title);
     return converted && whole ? ExitStatus::Done : ExitStatus::BadInput;
 }

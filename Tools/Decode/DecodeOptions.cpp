@@ -10,6 +10,9 @@ namespace velmora {
 
 namespace {
 
+/// A process each: far more than any machine has processors.
+constexpr std::uint64_t maximumJobs = 1000;
+
 /// Refuses options that make no sense together.
 void checkTogether(const DecodeOptions& options) {
     using Format = DecodeOptions::Format;
@@ -119,8 +122,8 @@ CLI::App* addDecode(CLI::App& app, DecodeOptions& options) {
     command->add_flag("--strict", options.isStrict,
                       "End at a message that ends the application; by default it is counted, reported and "
                       "left out");
-    command->add_option("--jobs", options.jobs, "Decode this many files in parallel")
-        ->check(positiveCount())
+    command->add_option("--jobs", options.jobs, "Decode this many files in parallel, at most 1000")
+        ->check(countUpTo(maximumJobs))
         ->type_name("N");
     command->footer(
         "With several files, text has the files' names as headings, json is one object after another,\n"

@@ -10,21 +10,31 @@
 #include "Tools/ServiceClient.h"
 
 #include <memory>
+#include <string>
 
 namespace velmora {
 
 namespace {
 
 /// Reports what has been recorded, and what has not. Returns the exit status.
-int sumUp(const RecordingSession& recording, const std::string& file, int status) {
+int sumUp(const RecordingSession& recording, int status) {
     const pcapngBlocks::PacketCount unsaved = recording.unsaved();
-    report("recorded " + std::to_string(recording.messages() - unsaved.messages) + " messages of " +
-           recording.technology() + ", " + std::to_string(recording.bytes() - unsaved.bytes) + " bytes");
+    std::string text = "recorded " + std::to_string(recording.messages() - unsaved.messages) +
+                       " messages of " + recording.technology() + ", " +
+                       std::to_string(recording.bytes() - unsaved.bytes) + " bytes";
+    if (!recording.moves().empty()) {
+        text +=
+            ", the last " + std::to_string(recording.messagesSinceMove() - unsaved.messages) + " of them in ";
+        for (const RecordingSession::Move& move : recording.moves())
+            text += (&move == &recording.moves().front() ? "" : " and ") + move.file;
+        status = ExitStatus::BadInput;
+    }
+    report(text);
     const std::uint64_t missing = unsaved.messages + recording.dropped();
     // A pipe's reader that has closed it does not miss messages.
     if (missing == 0 || recording.hasClosedReader())
         return status;
-    report(std::to_string(missing) + " messages are missing from " + file);
+    report(std::to_string(missing) + " messages are missing from " + recording.file());
     return ExitStatus::BadInput;
 }
 
@@ -46,8 +56,11 @@ int runRecord(const RecordOptions& options, DecoderLines& lines) {
     opened = &recording;
     ServiceClient client;
     int status = Recorder(options, recording, lines, client).run();
-    if (const Result<Done> closed = recording.close();
-        !closed && status == ExitStatus::Done && !recording.hasClosedReader()) {
+    const std::size_t reportedMoves = recording.moves().size();
+    const Result<Done> closed = recording.close();
+    for (std::size_t move = reportedMoves; move < recording.moves().size(); ++move)
+        report(recording.moves()[move].reason + "; the recording ends in " + recording.moves()[move].file);
+    if (!closed && status == ExitStatus::Done && !recording.hasClosedReader()) {
         report(closed.reason());
         status = ExitStatus::BadInput;
     }
@@ -56,7 +69,7 @@ int runRecord(const RecordOptions& options, DecoderLines& lines) {
             report("nothing was recorded: the telephony service has named no technology");
         return ExitStatus::BadInput;
     }
-    return sumUp(recording, options.file, status);
+    return sumUp(recording, status);
 }
 
 } // namespace velmora

@@ -7,6 +7,13 @@
 
 namespace velmora {
 
+namespace {
+
+/// Months of the fastest modem; what is above is a slip of the finger.
+constexpr std::uint64_t maximumCount = 1'000'000'000'000;
+
+} // namespace
+
 CLI::App* addRecord(CLI::App& app, RecordOptions& options) {
     CLI::App* command =
         app.add_subcommand("record", "Record the telephony service's messages until interrupted");
@@ -15,8 +22,10 @@ CLI::App* addRecord(CLI::App& app, RecordOptions& options) {
     command->add_option("--duration", options.duration_seconds, "Stop this long after the start")
         ->check(positiveSeconds())
         ->type_name("SECONDS");
-    command->add_option("--count", options.count, "Stop after this many messages")
-        ->check(positiveCount())
+    command
+        ->add_option("--count", options.count,
+                     "Stop after this many messages; with status 1 when the service's source ends before")
+        ->check(countUpTo(maximumCount))
         ->type_name("N");
     command
         ->add_option(
@@ -29,6 +38,9 @@ CLI::App* addRecord(CLI::App& app, RecordOptions& options) {
         "Messages are written, and their sync to storage started, within half a second. A failed write\n"
         "and a lost service are reported immediately; up to 32 MiB of messages are queued, and recording\n"
         "continues when it can. The exit status is 1 if messages are missing at the end.\n\n"
+        "The file is locked. If others remove, move, replace, truncate or write to it, recording goes on "
+        "into\n"
+        "a new file beside it, such as drive-2.pcapng, and the exit status is 1.\n\n"
         "Examples:\n"
         "  velmora-log record drive.pcapng\n"
         "  velmora-log record --duration 600 --force drive.pcapng\n"

@@ -34,10 +34,16 @@ std::chrono::nanoseconds nanosecondsOf(double seconds) {
 
 Recorder::Recorder(const RecordOptions& options, RecordingSession& session, DecoderLines& lines,
                    ServiceClient& client)
-    : _options(options), _session(session), _client(client), _news(session, options.file, client.clock.now()),
+    : _options(options), _session(session), _client(client), _news(session, client.clock.now()),
       _log(lines, [this](const std::string& problem) { reportProblem(problem); }) {
     RecordingModel::Events events;
+    events.connecting = [this] {
+        loseService();
+        // Once the attempt is over, and not half a second later: the service may be lost again by then.
+        _client.queue.async([this] { checkService(); });
+    };
     events.message = [this](const Data& message) { take(message); };
+    events.sourceEnded = [this] { endWithSource(); };
     events.technology = [this](std::string_view technology, bool hasDecoder) {
         return learn(technology, hasDecoder);
     };
@@ -72,14 +78,12 @@ bool Recorder::learn(std::string_view technology, bool hasDecoder) {
     if (!hasDecoder)
         return check(Failure{"the telephony service speaks " + std::string(shortTechnologyName(technology)) +
                              ", which has no decoder here, wanted one of " + technologyNames()});
-    // It may have ended and restarted between two checks.
-    if (std::exchange(_streaming, false))
-        serviceIsGone();
+    _hasTechnology = true;
     if (!check(_session.setTechnology(technology)))
         return false;
-    if (std::exchange(_gone, false))
-        _news.notify(std::string(serviceTitle) + " is back");
+    // The start command follows at once. A service that is lost before the next check is lost all the same.
     _streaming = true;
+    _hasStreamed = true;
     return true;
 }
 
@@ -91,6 +95,16 @@ void Recorder::take(const Data& message) {
         end(ExitStatus::Done);
     else if (_session.isLive())
         saveSoon();
+}
+
+/// A number of messages that has not come by now does not come at all.
+void Recorder::endWithSource() {
+    if (_ended || !_options.count)
+        return;
+    _news.notify(std::string(serviceTitle) + "'s source has ended after " +
+                 std::to_string(_session.messages()) + " of " + std::to_string(*_options.count) +
+                 " messages");
+    end(ExitStatus::BadInput);
 }
 
 /// Once the messages that have arrived are taken: those that come in a row are written together.
@@ -122,22 +136,37 @@ void Recorder::retry() {
 }
 
 void Recorder::checkService() {
+    if (_ended)
+        return;
     // The model checks by itself, but at the pace of its redraws.
     _model->refresh();
-    if (_streaming && !_model->isConnected()) {
-        _streaming = false;
-        serviceIsGone();
+    if (!_model->isConnected()) {
+        loseService();
+        return;
     }
+    _streaming = true;
+    _hasStreamed = true;
+    if (!std::exchange(_gone, false))
+        return;
+    // A service that does not name a technology again is streamed from as before.
+    _news.notify(std::string(serviceTitle) + " is back" +
+                 (_hasTechnology
+                      ? std::string()
+                      : ", without naming its technology; recording goes on as " + _session.technology()));
 }
 
-void Recorder::serviceIsGone() {
+/// Also at each attempt to connect: the service may have ended and restarted between two checks.
+void Recorder::loseService() {
+    if (_ended || !std::exchange(_streaming, false))
+        return;
     _gone = true;
+    _hasTechnology = false;
     _news.notify(std::string(serviceTitle) + " is gone; waiting for it");
 }
 
 /// At the start. Afterwards a lost service is reported as such, whatever the reason.
 void Recorder::reportProblem(const std::string& problem) {
-    if (!_ended && _session.technology().empty())
+    if (!_ended && !_hasStreamed)
         _news.inform(problem + "; retrying");
 }
 
@@ -151,6 +180,7 @@ void Recorder::giveUp() {
 
 /// Ends the recording on a failure, after reporting it. Returns whether there was none.
 bool Recorder::check(const Result<Done>& result) {
+    _news.reportMoves();
     if (result) {
         _news.reportWriteError();
         return true;

@@ -30,11 +30,12 @@ public:
 private:
     bool learn(std::string_view technology, bool hasDecoder);
     void take(const Data& message);
+    void endWithSource();
     void save();
     void saveSoon();
     void retry();
     void checkService();
-    void serviceIsGone();
+    void loseService();
     void giveUp();
     void reportProblem(const std::string& problem);
     bool check(const Result<Done>& result);
@@ -47,8 +48,10 @@ private:
     RecordingNews _news;
     ServiceLog _log; ///< over the progress line of the news, which only lines that are written replace
     std::shared_ptr<RecordingModel> _model;
-    bool _streaming = false; ///< the start command has been sent
-    bool _gone = false;      ///< the service is gone, and that has been reported
+    bool _streaming = false;     ///< the start command has been sent
+    bool _hasStreamed = false;   ///< at any time so far
+    bool _gone = false;          ///< the service is gone, and that has been reported
+    bool _hasTechnology = false; ///< named since the service was lost
     bool _ended = false;
     bool _savesSoon = false; ///< a task is queued that saves what has been taken
 };

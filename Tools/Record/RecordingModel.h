@@ -17,15 +17,24 @@ namespace velmora {
 class RecordingModel final : public VelmoraModel {
 public:
     struct Events {
+        /// The connection is about to be made, for the first time or again.
+        std::function<void()> connecting;
         std::function<void(const Data& message)> message;
+        /// The service's source has no more messages.
+        std::function<void()> sourceEnded;
         /// Returns whether to record messages of this technology.
         std::function<bool(std::string_view technology, bool hasDecoder)> technology;
     };
 
     RecordingModel(ModelPlatform platform, Events events)
-        : VelmoraModel(std::move(platform), nullptr), _events(std::move(events)) {}
+        : VelmoraModel(announcing(std::move(platform), events.connecting), nullptr),
+          _events(std::move(events)) {}
 
     void updateWithData(const Data& data) override { _events.message(data); }
+    void takeOtherMessage(std::int32_t messageId) override {
+        if (messageId == vox::sourceEndedMessage)
+            _events.sourceEnded();
+    }
 
 protected:
     [[nodiscard]] std::unique_ptr<LogGenerator>
@@ -36,6 +45,15 @@ protected:
     }
 
 private:
+    /// The local port's name is built afresh for every connection.
+    static ModelPlatform announcing(ModelPlatform platform, std::function<void()> connecting) {
+        platform.portName = [connecting = std::move(connecting), name = std::move(platform.portName)] {
+            connecting();
+            return name();
+        };
+        return platform;
+    }
+
     Events _events;
 };
 

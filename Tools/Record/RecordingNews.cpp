@@ -21,8 +21,8 @@ std::string queueSize() {
 
 } // namespace
 
-RecordingNews::RecordingNews(const RecordingSession& session, std::string file, Time started)
-    : _session(session), _file(std::move(file)), _started(started) {
+RecordingNews::RecordingNews(const RecordingSession& session, Time started)
+    : _session(session), _started(started) {
     if (::isatty(STDERR_FILENO) != 0)
         _progress = std::make_unique<ProgressLine>();
 }
@@ -38,16 +38,23 @@ void RecordingNews::notify(const std::string& text) {
     logLine(LogPriority::Error, text);
 }
 
+void RecordingNews::reportMoves() {
+    for (; _reportedMoves < _session.moves().size(); ++_reportedMoves) {
+        const RecordingSession::Move& move = _session.moves()[_reportedMoves];
+        notify(move.reason + "; recording goes on into " + move.file);
+    }
+}
+
 void RecordingNews::reportWriteError() {
     const bool hasError = !_session.temporaryError().empty();
     if (hasError && !_reportedError)
         notify(_session.temporaryError() + "; recording goes on when it can be, until then up to " +
                queueSize() + " of messages wait");
     if (_session.isDropping() && !_reportedDropping)
-        notify(queueSize() + " of messages wait for " + _file + "; further ones are dropped");
+        notify(queueSize() + " of messages wait for " + _session.file() + "; further ones are dropped");
     if (!hasError && _reportedError) {
         const std::uint64_t dropped = _session.dropped() - _droppedBefore;
-        notify(_file + " can be written again; " + (dropped == 0 ? "no" : std::to_string(dropped)) +
+        notify(_session.file() + " can be written again; " + (dropped == 0 ? "no" : std::to_string(dropped)) +
                " messages were dropped");
         _droppedBefore = _session.dropped();
     }

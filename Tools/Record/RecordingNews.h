@@ -6,6 +6,7 @@
 #include "Tools/LogOverride.h"
 #include "Tools/Record/RecordingSession.h"
 
+#include <cstddef>
 #include <cstdint>
 #include <memory>
 #include <string>
@@ -16,13 +17,15 @@ namespace velmora {
 /// progress where standard error is a terminal. Main thread only.
 class RecordingNews {
 public:
-    /// `session` must outlive this; `file` is what messages call the recording.
-    RecordingNews(const RecordingSession& session, std::string file, Time started);
+    /// `session` must outlive this.
+    RecordingNews(const RecordingSession& session, Time started);
 
     /// A message for the user.
     void inform(const std::string& text);
     /// A message that the user must get even without looking at the terminal: it goes to the log as well.
     void notify(const std::string& text);
+    /// Reports each file that the recording was continued in, once.
+    void reportMoves();
     /// Reports each change once: a temporary error, dropped messages, the end of the error.
     void reportWriteError();
 
@@ -31,9 +34,9 @@ public:
 
 private:
     const RecordingSession& _session;
-    std::string _file;
     Time _started;
     std::unique_ptr<ProgressLine> _progress;
+    std::size_t _reportedMoves = 0;
     bool _reportedError = false;
     bool _reportedDropping = false;
     std::uint64_t _droppedBefore = 0; ///< in all earlier errors

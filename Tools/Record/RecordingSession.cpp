@@ -3,67 +3,50 @@
 
 #include "Tools/Record/RecordingSession.h"
 
+#include "Platform/Linux/Errno.h"
 #include "Platform/Linux/Files/AtomicFile.h"
 #include "Platform/TelephonyService.h"
-#include "Tools/Report.h"
+#include "Recording/Files/DescriptorFile.h"
+#include "Tools/OverwriteTarget.h"
 
-#include <cerrno>
 #include <filesystem>
-#include <system_error>
 #include <utility>
 
 #include <fcntl.h>
 #include <poll.h>
-#include <sys/stat.h>
 #include <unistd.h>
 
 namespace velmora {
 
 namespace {
 
-constexpr mode_t newFileMode = 0666;
-
-bool isRegularFile(int descriptor) {
-    struct stat status = {};
-    return ::fstat(descriptor, &status) == 0 && S_ISREG(status.st_mode);
-}
-
-bool isFilledFile(int descriptor) {
-    struct stat status = {};
-    return ::fstat(descriptor, &status) == 0 && S_ISREG(status.st_mode) && status.st_size > 0;
+/// For a writer, which closes its descriptor.
+Result<std::unique_ptr<DescriptorFile>> secondDescriptor(int descriptor, const std::string& path) {
+    const int copy = ::fcntl(descriptor, F_DUPFD_CLOEXEC, 0);
+    if (copy < 0)
+        return Failure{"cannot write " + path + ": " + errnoText(errno)};
+    return std::make_unique<DescriptorFile>(copy, true);
 }
 
 } // namespace
 
 Result<std::unique_ptr<RecordingSession>> RecordingSession::open(const std::string& path, bool force) {
-    std::unique_ptr<RecordingSession> session(new RecordingSession(path));
     if (path == "-") {
+        std::unique_ptr<RecordingSession> session(new RecordingSession({path, {}, false}));
         session->_isLive = !isRegularFile(STDOUT_FILENO);
         return session;
     }
-    session->_file =
-        FileDescriptor(::open(path.c_str(), O_WRONLY | O_CREAT | O_EXCL | O_CLOEXEC, newFileMode));
-    session->_created = session->_file.get() >= 0;
-    if (!session->_created && errno == EEXIST) {
-        session->_file = FileDescriptor(::open(path.c_str(), O_WRONLY | O_CLOEXEC));
-        if (session->_file.get() >= 0 && isRegularFile(session->_file.get()) && !force)
-            return Failure{fileExistsMessage(path)};
-    }
-    if (session->_file.get() < 0)
-        return Failure{"cannot create " + path + ": " + std::generic_category().message(errno)};
-    session->_isLive = !isRegularFile(session->_file.get());
+    Result<RecordingFile> file = RecordingFile::open(path, force);
+    if (!file)
+        return Failure{file.reason()};
+    std::unique_ptr<RecordingSession> session(new RecordingSession(*std::move(file)));
+    session->_isLive = !session->_file.isRegular();
     return session;
 }
 
 RecordingSession::~RecordingSession() {
     _writer.reset();
     removeIfEmpty();
-}
-
-void RecordingSession::removeIfEmpty() const {
-    struct stat status = {};
-    if (_created && ::stat(_path.c_str(), &status) == 0 && S_ISREG(status.st_mode) && status.st_size == 0)
-        ::unlink(_path.c_str());
 }
 
 Result<Done> RecordingSession::setTechnology(std::string_view technology) {
@@ -73,39 +56,51 @@ Result<Done> RecordingSession::setTechnology(std::string_view technology) {
                        _technology};
     if (_writer)
         return Done{};
-    // A file that is to be overwritten stays as it is until the new one has its head.
-    std::optional<AtomicFile> file;
-    if (isFilledFile(_file.get())) {
-        std::error_code error;
-        std::filesystem::path place = std::filesystem::canonical(_path, error); // a symbolic link stays one
-        if (error)
-            place = _path;
-        Result<AtomicFile> made = AtomicFile::create(place, newFileMode);
-        if (!made)
-            return Failure{_path + ": " + made.reason()};
-        file.emplace(*std::move(made));
-    }
-    // The writer closes its descriptor, and so gets one of its own.
-    const int descriptor = file ? file->descriptor() : _file.get();
-    const int copy = _path == "-" ? -1 : ::fcntl(descriptor, F_DUPFD_CLOEXEC, 0);
-    if (_path != "-" && copy < 0)
-        return Failure{"cannot write " + _path + ": " + std::generic_category().message(errno)};
-    Result<std::unique_ptr<PcapngWriter>> writer =
-        _path == "-" ? PcapngWriter::create(_path, name) : PcapngWriter::adopt(copy, _path, name);
-    _file.reset();
+    Result<std::unique_ptr<PcapngWriter>> writer = startWriter(name);
     if (!writer)
         return Failure{writer.reason()};
-    if (file) {
-        if (Result<Done> written = (*writer)->flush(); !written) // the head may be waiting
-            return written;
-        if (const Result<Done> committed = file->commit(AtomicFile::IfExists::Replace); !committed)
-            return Failure{_path + ": " + committed.reason()};
-    }
     _writer = *std::move(writer);
     _technology = name;
     return keepTemporaryError(_writer->flush()); // the head may be waiting
 }
 
+Result<std::unique_ptr<PcapngWriter>> RecordingSession::startWriter(std::string_view technology) {
+    if (_file.path == "-")
+        return PcapngWriter::create(_file.path, technology);
+    if (_file.isRegular() && !_file.isEmpty())
+        return overwriteWith(technology);
+    Result<std::unique_ptr<DescriptorFile>> file = secondDescriptor(_file.descriptor.get(), _file.path);
+    if (!file)
+        return Failure{file.reason()};
+    (*file)->watchForChanges(_file.path);
+    return PcapngWriter::start(*std::move(file), _file.path, technology);
+}
+
+/// A file that is to be overwritten stays as it is until the new one has its head.
+Result<std::unique_ptr<PcapngWriter>> RecordingSession::overwriteWith(std::string_view technology) {
+    const Result<std::filesystem::path> target = overwriteTarget(_file.path);
+    if (!target)
+        return Failure{target.reason()};
+    Result<AtomicFile> made = AtomicFile::create(*target, RecordingFile::newFileMode);
+    if (!made)
+        return Failure{_file.path + ": " + made.reason()};
+    static_cast<void>(lockRecording(made->descriptor())); // before it has a name that others know
+    Result<std::unique_ptr<DescriptorFile>> file = secondDescriptor(made->descriptor(), _file.path);
+    if (!file)
+        return Failure{file.reason()};
+    DescriptorFile& written = **file;
+    Result<std::unique_ptr<PcapngWriter>> writer =
+        PcapngWriter::start(*std::move(file), _file.path, technology);
+    if (!writer)
+        return writer;
+    if (const Result<Done> head = (*writer)->flush(); !head) // it may be waiting
+        return Failure{head.reason()};
+    if (const Result<Done> committed = made->commit(AtomicFile::IfExists::Replace); !committed)
+        return Failure{_file.path + ": " + committed.reason()};
+    written.watchForChanges(_file.path);
+    _file.descriptor.reset(); // the old one, which was locked until now
+    return writer;
+}
 Result<Done> RecordingSession::append(Time time, Bytes message) {
     const std::uint64_t before = _writer->messages();
     Result<Done> appended = _writer->append(time, message);
@@ -115,12 +110,39 @@ Result<Done> RecordingSession::append(Time time, Bytes message) {
 }
 
 Result<Done> RecordingSession::save() {
+    if (_writer)
+        return keepTemporaryError(_writer->sync());
+    // What is overwritten may be changed by others until it is.
+    const OutputFile::Change change =
+        _file.isCreated ? changeOf(_file.descriptor.get(), _file.path, 0, 0) : OutputFile::Change();
+    return change.kind == OutputFile::Change::Kind::None ? Done{} : moveOn(change.kind);
+}
+
+/// Continues in a file beside the one that others have changed; a failure to create it is a temporary error.
+Result<Done> RecordingSession::moveOn(OutputFile::Change::Kind change) {
+    const std::string what = (_file.path + " ").append(OutputFile::describe(change));
+    Result<RecordingFile> beside = RecordingFile::createBeside(_path);
+    Result<std::unique_ptr<DescriptorFile>> file =
+        beside ? secondDescriptor(beside->descriptor.get(), beside->path) : Failure{beside.reason()};
+    if (!file) {
+        _temporaryError = what + ", and " + file.reason();
+        return Done{};
+    }
+    _temporaryError.clear();
+    _file = *std::move(beside);
+    _moves.push_back({what, _file.path});
     if (!_writer)
         return Done{};
-    return keepTemporaryError(_writer->sync());
+    (*file)->watchForChanges(_file.path);
+    Result<Done> result = _writer->continueIn(*std::move(file), _file.path);
+    if (!_messagesBeforeMove)
+        _messagesBeforeMove = _writer->messages() - _writer->messagesOfFile();
+    return keepTemporaryError(std::move(result));
 }
 
 Result<Done> RecordingSession::keepTemporaryError(Result<Done> result) {
+    if (_writer->change() != OutputFile::Change::Kind::None)
+        return moveOn(_writer->change());
     const bool waiting = _writer->hasTemporaryError();
     if (!waiting)
         _temporaryError.clear();
@@ -132,12 +154,14 @@ Result<Done> RecordingSession::keepTemporaryError(Result<Done> result) {
 Result<Done> RecordingSession::close() {
     if (!_writer)
         return Done{};
+    // The file may have been changed since the last save.
+    static_cast<void>(keepTemporaryError(_writer->flush()));
     return _writer->close();
 }
 
 bool RecordingSession::hasClosedReader() const {
     pollfd watched{STDOUT_FILENO, 0, 0};
-    return _path == "-" && ::poll(&watched, 1, 0) > 0 && (watched.revents & POLLERR) != 0;
+    return _file.path == "-" && ::poll(&watched, 1, 0) > 0 && (watched.revents & POLLERR) != 0;
 }
 
 } // namespace velmora

@@ -4,21 +4,26 @@
 #pragma once
 
 #include "Platform/Clock.h"
-#include "Platform/Linux/Files/FileDescriptor.h"
 #include "Platform/Result.h"
 #include "Recording/Pcapng/PcapngWriter.h"
+#include "Tools/Record/RecordingFile.h"
 
 #include <cstdint>
 #include <memory>
 #include <optional>
 #include <string>
 #include <string_view>
+#include <utility>
+#include <vector>
 
 namespace velmora {
 
 /// A recording that is being written. The file is created at once, so that an error shows at once; its head
 /// is written when the technology is known. Without a technology no file is left. A file that is overwritten
-/// is replaced in one step, by one that has its head. Main thread only.
+/// is replaced in one step, by one that has its head.
+///
+/// A file that others remove, replace or write to while it is recorded to is left at the next save, and the
+/// recording continues in a new file beside it, with what was buffered. Main thread only.
 class RecordingSession {
 public:
     /// Opens the file, "-" being standard output. A regular file that is there already is refused unless
@@ -36,7 +41,8 @@ public:
     /// `temporaryError`). Precondition: the technology is known.
     Result<Done> append(Time time, Bytes message);
     /// Writes the buffer to the file and starts its sync to storage; does nothing before the technology is
-    /// known. Retries after a temporary error. A failure is as above.
+    /// known but to notice that others have changed the file. Retries after a temporary error. A failure is
+    /// as above.
     Result<Done> save();
     /// Ends the recording. A temporary error that persists is a failure now.
     Result<Done> close();
@@ -55,6 +61,18 @@ public:
     [[nodiscard]] std::uint64_t dropped() const { return _writer ? _writer->droppedMessages() : 0; }
     /// The temporary error; empty when there is none. Messages are queued meanwhile.
     [[nodiscard]] const std::string& temporaryError() const { return _temporaryError; }
+    /// A change of file.
+    struct Move {
+        std::string reason; ///< "drive.pcapng was removed"
+        std::string file;   ///< in which the recording continues
+    };
+    [[nodiscard]] const std::vector<Move>& moves() const { return _moves; }
+    /// Of the messages, those that were left to the files after the first.
+    [[nodiscard]] std::uint64_t messagesSinceMove() const {
+        return messages() - _messagesBeforeMove.value_or(0);
+    }
+    /// The present file.
+    [[nodiscard]] const std::string& file() const { return _file.path; }
     /// Whether the queue is full.
     [[nodiscard]] bool isDropping() const { return _writer && _writer->isDropping(); }
     /// Whether the recording goes to a pipe or the like, where a reader may wait for each message.
@@ -63,22 +81,26 @@ public:
     [[nodiscard]] bool hasClosedReader() const;
     /// Removes the file that this has created, if it is still empty: for a program that ends without
     /// destructors. Allocates nothing.
-    void removeIfEmpty() const;
+    void removeIfEmpty() const { _file.removeIfEmpty(); }
 
 private:
-    explicit RecordingSession(std::string path) : _path(std::move(path)) {}
+    explicit RecordingSession(RecordingFile file) : _path(file.path), _file(std::move(file)) {}
 
+    [[nodiscard]] Result<std::unique_ptr<PcapngWriter>> startWriter(std::string_view technology);
+    [[nodiscard]] Result<std::unique_ptr<PcapngWriter>> overwriteWith(std::string_view technology);
+    [[nodiscard]] Result<Done> moveOn(OutputFile::Change::Kind change);
     /// Turns a temporary error into success, and keeps its reason.
     [[nodiscard]] Result<Done> keepTemporaryError(Result<Done> result);
 
-    std::string _path;
-    FileDescriptor _file;  ///< until the writer has it
-    bool _created = false; ///< this created the file
+    std::string _path;   ///< of the first file
+    RecordingFile _file; ///< the present one; open as long as it may have to be removed
     bool _isLive = false;
     std::unique_ptr<PcapngWriter> _writer;
     std::string _technology;
     std::string _temporaryError;
     std::uint64_t _bytes = 0;
+    std::vector<Move> _moves;
+    std::optional<std::uint64_t> _messagesBeforeMove;
 };
 
 } // namespace velmora

@@ -37,7 +37,11 @@ protected:
             _events.changed(technology);
         _technology = technology;
         const DecoderLog log(_lines);
-        return VelmoraModel::generatorFromTechnology(technology);
+        std::unique_ptr<LogGenerator> decoder = VelmoraModel::generatorFromTechnology(technology);
+        // It is for snapshots, which are not made here, and holds the messages of five refreshes.
+        if (decoder)
+            decoder->setKeepsHistory(false);
+        return decoder;
     }
 
 private:

@@ -56,10 +56,26 @@ Result<Done> writeAll(int descriptor, Bytes content) {
 }
 
 Result<Done> writeFile(const std::filesystem::path& path, Bytes content) {
-    FileDescriptor file(::open(path.c_str(), O_WRONLY | O_CREAT | O_TRUNC | O_CLOEXEC, 0666));
+    FileDescriptor file(::open(path.c_str(), O_WRONLY | O_CREAT | O_TRUNC | O_CLOEXEC, S_IRUSR | S_IWUSR));
     if (!file)
         return Failure{"cannot be opened for writing: " + errnoText(errno)};
     return writeAll(file.get(), content);
+}
+
+std::error_code makePrivateDirectory(const std::filesystem::path& path) {
+    std::filesystem::path made;
+    for (const std::filesystem::path& part : path) {
+        made /= part;
+        std::error_code ignored; // what is not a directory shows when one is made in it
+        if (std::filesystem::is_directory(made, ignored))
+            continue;
+        if (::mkdir(made.c_str(), S_IRWXU) != 0 && errno != EEXIST)
+            return {errno, std::generic_category()};
+    }
+    std::error_code error;
+    if (!std::filesystem::is_directory(path, error) && !error)
+        error = std::make_error_code(std::errc::not_a_directory);
+    return error;
 }
 
 Result<Done> replaceFile(const std::filesystem::path& path, Bytes content) {

@@ -8,6 +8,7 @@
 
 #include <cstddef>
 #include <filesystem>
+#include <system_error>
 
 namespace velmora {
 
@@ -18,9 +19,12 @@ Result<Data> readFile(const std::filesystem::path& path, std::size_t maximumByte
 /// Writes all of it to an open file. The reason is as readFile's.
 Result<Done> writeAll(int descriptor, Bytes content);
 
-/// Creates the file, or overwrites its content in place: a concurrent reader sees part of it, and a failure
-/// leaves it partly written. The reason is as readFile's.
+/// Creates the file, for its user alone, or overwrites its content in place: a concurrent reader sees part of
+/// it, and a failure leaves it partly written. The reason is as readFile's.
 Result<Done> writeFile(const std::filesystem::path& path, Bytes content);
+
+/// Creates the directory, for its user alone, and those above it; nothing where it exists already.
+[[nodiscard]] std::error_code makePrivateDirectory(const std::filesystem::path& path);
 
 /// Creates the file, or atomically replaces it by a new one with the same permissions: a reader sees the old
 /// or the new content, also after a failure. The reason is as readFile's.

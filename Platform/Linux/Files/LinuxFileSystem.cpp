@@ -33,9 +33,7 @@ LinuxFileSystem::LinuxFileSystem(Options options)
 Result<Done> LinuxFileSystem::makeStandardLogDirectory() const {
     if (!_isStandard)
         return Done();
-    std::error_code error;
-    std::filesystem::create_directories(_logDirectory, error);
-    if (error)
+    if (const std::error_code error = makePrivateDirectory(_logDirectory); error)
         return Failure{_logDirectory.string() + ": cannot be made: " + error.message()};
     return Done();
 }

@@ -12,6 +12,7 @@ from velmora_chaos.crowd import run_crowd
 from velmora_chaos.flood import run_flood
 from velmora_chaos.hostile import run_hostile
 from velmora_chaos.options import Options, parse_options
+from velmora_chaos.recordings import run_recordings
 from velmora_chaos.restarts import Victim, run_restarts
 
 Experiment = Callable[[Options], None]
@@ -23,6 +24,7 @@ EXPERIMENTS: Mapping[str, Experiment] = {
     "hostile": run_hostile,
     "crowd": run_crowd,
     "closed": run_closed,
+    "recordings": run_recordings,
     "flood": run_flood,
 }
 

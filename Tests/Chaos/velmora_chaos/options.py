@@ -17,6 +17,8 @@ DESCRIPTION = """Stress tests of the telephony service and the application, obse
   crowd     as many idle connections as a port takes, unfinished frames of 180 MiB, and requests for channels to
             the service itself: a new client is served, memory and the log stay bounded
   closed    the service and a recorder without standard descriptors: no log line goes into another file
+  recordings  files are removed, truncated, moved and replaced while a recorder writes to them, and a second
+            recorder wants them; the recorder says so within a second, and no message is lost
   flood     100,000 messages a second: the screen answers in time, memory stays bounded, and what a slow
             client does not take is counted and logged
 """

@@ -45,11 +45,20 @@ class Program:
 
     def end_cleanly(self) -> None:
         """Sends SIGTERM; raises Problem unless the program was running and then exits with status 0."""
+        self.end_with(0)
+
+    def end_with(self, wanted: int) -> None:
+        """As `end_cleanly`, with another exit status."""
         status = self._process.poll()
         expect(status is None, f"{self.name} has already ended with {status}")
         self._process.terminate()
         status = self._process.wait(END_S)
-        expect(status == 0, f"{self.name} ended with {status} on SIGTERM")
+        expect(status == wanted, f"{self.name} ended with {status} on SIGTERM, wanted {wanted}")
+
+    def wait_for_end(self, wanted: int) -> None:
+        """Waits until the program ends by itself; raises Problem for another exit status."""
+        status = self._process.wait(END_S)
+        expect(status == wanted, f"{self.name} ended with {status}, wanted {wanted}")
 
 
 def process_resident_kib(pid: int) -> int:

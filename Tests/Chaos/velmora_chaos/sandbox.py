@@ -89,6 +89,10 @@ class Sandbox:
         self._started.append(started)
         return started
 
+    def recorder(self, file: Path, *options: str) -> Program:
+        """A recorder into that file; its standard error is read."""
+        return self._start("velmora-log", "record", *options, str(file), reads_errors=True)
+
     def _start(self, program: str, *arguments: str, reads_errors: bool = False) -> Program:
         process = subprocess.Popen(
             [str(self._build / program), *arguments],

@@ -105,13 +105,13 @@ TEST_F(ConvertCommandTest, DashIsStandardInput) {
     EXPECT_EQ(messagesOf("out/drive.dlf").size(), 3U);
 }
 
-TEST_F(ConvertCommandTest, NewFileHasTheUsualPermissions) {
-    EXPECT_EQ(convert({path("drive.pcapng"), path("out/drive.dlf")}, 0), "");
-    const mode_t mask = ::umask(0);
-    ::umask(mask);
-    struct stat status = {};
-    ASSERT_EQ(::stat(path("out/drive.dlf").c_str(), &status), 0);
-    EXPECT_EQ(status.st_mode & 0777, 0666 & ~mask);
+TEST_F(ConvertCommandTest, NewFileIsItsUsersAlone) {
+    const mode_t earlier = ::umask(0);
+    for (const char* name : {"out/drive.dlf", "out/drive.pcapng", "out/drive.velmora"}) {
+        EXPECT_EQ(convert({path("drive.pcapng"), path(name)}, 0), "");
+        EXPECT_EQ(std::filesystem::status(path(name)).permissions(), std::filesystem::perms(0600)) << name;
+    }
+    ::umask(earlier);
 }
 
 TEST_F(ConvertCommandTest, OutputWithoutAFormIsAUsageError) {
@@ -132,6 +132,33 @@ TEST_F(ConvertCommandTest, FileThatIsThereIsKeptUnlessForced) {
     EXPECT_EQ(messagesOf("out/drive.dlf").size(), 3U);
     EXPECT_EQ(std::filesystem::status(path("out/drive.dlf")).permissions(), std::filesystem::perms(0640));
     EXPECT_THAT(outputs(), ElementsAre("drive.dlf"));
+}
+
+TEST_F(ConvertCommandTest, SymbolicLinkIsFollowed) {
+    std::filesystem::create_directory(_directory / "elsewhere");
+    std::ofstream(path("elsewhere/old.dlf")) << "an earlier one";
+    std::filesystem::create_symlink(path("elsewhere/old.dlf"), path("out/link.dlf"));
+    EXPECT_EQ(convert({path("drive.pcapng"), path("out/link.dlf")}, 1),
+              "velmora-log: " + path("out/link.dlf") + " is there already; --force overwrites it\n");
+    EXPECT_EQ(convert({"--force", path("drive.pcapng"), path("out/link.dlf")}, 0), "");
+    EXPECT_TRUE(std::filesystem::is_symlink(path("out/link.dlf")));
+    EXPECT_FALSE(std::filesystem::is_symlink(path("elsewhere/old.dlf")));
+    EXPECT_EQ(messagesOf("elsewhere/old.dlf").size(), 3U);
+    EXPECT_THAT(outputs(), ElementsAre("link.dlf"));
+}
+
+TEST_F(ConvertCommandTest, SymbolicLinkIsFollowedToAFileOfTheUserOnly) {
+    std::filesystem::create_symlink(path("gone.dlf"), path("out/link.dlf"));
+    EXPECT_EQ(convert({"--force", path("drive.pcapng"), path("out/link.dlf")}, 1),
+              "velmora-log: " + path("out/link.dlf") + " is a symbolic link to a file that does not exist\n");
+    EXPECT_FALSE(std::filesystem::exists(path("gone.dlf")));
+    std::ofstream(path("gone.dlf")) << "another user's";
+    if (::chown(path("gone.dlf").c_str(), 1, 1) != 0)
+        GTEST_SKIP() << "only root can give files away";
+    EXPECT_EQ(convert({"--force", path("drive.pcapng"), path("out/link.dlf")}, 1),
+              "velmora-log: " + path("out/link.dlf") + " is a symbolic link to " + path("gone.dlf") +
+                  ", wanted a regular file of this user\n");
+    EXPECT_EQ(contentOf("gone.dlf"), "another user's");
 }
 
 TEST_F(ConvertCommandTest, InputIsNeverTheOutput) {

@@ -64,6 +64,24 @@ TEST_F(RecordCommandTest, CountIsExact) {
     EXPECT_THAT(messagesOf("drive.pcapng", "Ostrel_GSM"), ElementsAre(rrState(1), rrState(2)));
 }
 
+TEST_F(RecordCommandTest, CountEndsWithTheSource) {
+    startService();
+    ToolProcess process(tool({"record", "--count", "3", path("drive.pcapng")}));
+    ToolProcess open(tool({"record", "--duration", "1.5", path("open.pcapng")}));
+    ASSERT_TRUE(isStreaming(2));
+    _service->send(rrState(1));
+    _service->send(rrState(2));
+    _service->sendEnd();
+    EXPECT_EQ(process.exitStatus(), 1);
+    EXPECT_EQ(ownMessages(process.errors()),
+              "velmora-log: the telephony service's source has ended after 2 of 3 messages\n"
+              "velmora-log: recorded 2 messages of Ostrel_GSM, 34 bytes\n");
+    EXPECT_THAT(messagesOf("drive.pcapng", "Ostrel_GSM"), ElementsAre(rrState(1), rrState(2)));
+    // Without a number of messages there is nothing that can no longer be reached.
+    EXPECT_EQ(open.exitStatus(), 0);
+    EXPECT_EQ(ownMessages(open.errors()), "velmora-log: recorded 2 messages of Ostrel_GSM, 34 bytes\n");
+}
+
 TEST_F(RecordCommandTest, DurationEndsARecordingWithoutMessages) {
     startService();
     ToolProcess process(tool({"record", "--duration", "0.2", path("drive.pcapng")}));

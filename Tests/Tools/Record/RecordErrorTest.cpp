@@ -129,6 +129,46 @@ TEST_F(RecordErrorTest, LostAndRestartedServiceIsReported) {
               words({_gone, "the telephony service is back", "recorded 2 messages of Ostrel_GSM, 34 bytes"}));
 }
 
+TEST_F(RecordErrorTest, EveryLossAndReturnIsReportedWithoutATechnology) {
+    startService();
+    ToolProcess process(tool({"record", _file}));
+    ASSERT_TRUE(isStreaming());
+    const std::string back =
+        "the telephony service is back, without naming its technology; recording goes on "
+        "as Ostrel_GSM";
+    for (std::uint8_t round = 1; round <= 2; ++round) {
+        const std::size_t before = ownMessages(process.errors()).size();
+        _service.reset();
+        ASSERT_TRUE(eventually([&] { return ownMessages(process.errors()).size() > before; }));
+        startService("");
+        ASSERT_TRUE(isStreaming());
+        _service->send(rrState(round));
+        ASSERT_TRUE(fileHolds(round));
+    }
+    _service.reset();
+    startService();
+    ASSERT_TRUE(process.waitForError("the telephony service is back\n"));
+    process.signal(SIGTERM);
+    EXPECT_EQ(process.exitStatus(), 0);
+    EXPECT_EQ(ownMessages(process.errors()),
+              words({_gone, back, _gone, back, _gone, "the telephony service is back",
+                     "recorded 2 messages of Ostrel_GSM, 34 bytes"}));
+}
+
+TEST_F(RecordErrorTest, RestartBetweenTwoChecksIsReported) {
+    startService();
+    ToolProcess process(tool({"record", _file}));
+    ASSERT_TRUE(isStreaming());
+    _service.reset();
+    startService(""); // before the recorder can have noticed
+    ASSERT_TRUE(isStreaming());
+    ASSERT_TRUE(process.waitForError("recording goes on as Ostrel_GSM\n"));
+    process.signal(SIGTERM);
+    EXPECT_EQ(process.exitStatus(), 0);
+    EXPECT_THAT(ownMessages(process.errors()),
+                testing::StartsWith(words({_gone}) + "velmora-log: the telephony service is back, without"));
+}
+
 TEST_F(RecordErrorTest, TerminalShowsProgress) {
     ToolProcess::Setup setup = tool({"record", "--log-level", "0", _file});
     setup.onTerminal = true;

@@ -8,7 +8,6 @@
 #include <cerrno>
 #include <csignal>
 #include <string_view>
-#include <system_error>
 #include <utility>
 
 #include <fcntl.h>
@@ -30,7 +29,7 @@ struct Pipe {
 Pipe openPipe() {
     int ends[2];
     if (::pipe2(ends, O_CLOEXEC) != 0)
-        throw std::system_error(errno, std::generic_category(), "no pipe for a job");
+        throw NoRoomForJob(errno, "no pipe for a job");
     return {FileDescriptor(ends[0]), FileDescriptor(ends[1])};
 }
 
@@ -42,15 +41,17 @@ std::optional<std::string_view> readPiece(int descriptor, std::vector<char>& buf
     return std::string_view(buffer.data(), count > 0 ? static_cast<std::size_t>(count) : 0);
 }
 
-/// All that the new process does.
-[[noreturn]] void runJob(std::size_t index, const Job& job, pid_t parent, int output, int errors) {
+/// All that the new process does, with the writing ends of its pipes.
+[[noreturn]] void runJob(std::size_t index, const Job& job, pid_t parent, const FileDescriptor& output,
+                         FileDescriptor errors) {
     // A parent that was killed prints nothing any more.
     ::prctl(PR_SET_PDEATHSIG, SIGKILL);
-    if (::getppid() != parent || ::dup2(errors, STDERR_FILENO) < 0)
+    if (::getppid() != parent || ::dup2(errors.get(), STDERR_FILENO) < 0)
         ::_exit(ExitStatus::BadInput);
+    errors.reset();
     bool good = false;
     {
-        Output part(output, "to the process that prints");
+        Output part(output.get(), "to the process that prints");
         good = job(index, part);
     }
     ::_exit(good ? ExitStatus::Done : JobProcess::badButOver);
@@ -58,17 +59,26 @@ std::optional<std::string_view> readPiece(int descriptor, std::vector<char>& buf
 
 } // namespace
 
-JobProcess::JobProcess(std::size_t index, const Job& job) {
+JobProcess::JobProcess(std::size_t index, const Job& job, const std::function<void()>& inNewProcess) {
     Pipe output = openPipe();
     Pipe errors = openPipe();
     const pid_t parent = ::getpid();
     _id = ::fork();
     if (_id < 0)
-        throw std::system_error(errno, std::generic_category(), "no process for a job");
-    if (_id == 0)
-        runJob(index, job, parent, output.writing.get(), errors.writing.get());
+        throw NoRoomForJob(errno, "no process for a job");
     _output = std::move(output.reading);
     _errors = std::move(errors.reading);
+    if (_id == 0) {
+        closeCopies();
+        inNewProcess();
+        runJob(index, job, parent, output.writing, std::move(errors.writing));
+    }
+}
+
+void JobProcess::closeCopies() {
+    _output.reset();
+    _errors.reset();
+    _spool.closeCopy();
 }
 
 JobProcess::~JobProcess() {

@@ -11,6 +11,7 @@
 #include <functional>
 #include <optional>
 #include <string>
+#include <system_error>
 #include <vector>
 
 #include <poll.h>
@@ -30,6 +31,12 @@ struct JobOutlets {
     Output& errors;
 };
 
+/// The system has no process or no pipe for a job. No job throws it: what a job throws ends its process.
+class NoRoomForJob final : public std::system_error {
+public:
+    NoRoomForJob(int error, const char* what) : std::system_error(error, std::generic_category(), what) {}
+};
+
 /// A process that does one job, and the pipes that its output and its errors come from. A job that is not
 /// first in line has its output kept, in a spool and then in the pipe itself, and its errors, up to 1 MiB.
 /// The destructor kills the process.
@@ -40,11 +47,15 @@ public:
     static constexpr int badButOver = 3;
     static_assert(badButOver != ExitStatus::Done && badButOver != ExitStatus::BadInput);
 
-    /// Starts the process. Throws std::system_error where the system has no process or no pipe for it.
-    JobProcess(std::size_t index, const Job& job);
+    /// Starts the process. `inNewProcess` runs there before the job. Throws NoRoomForJob.
+    JobProcess(std::size_t index, const Job& job, const std::function<void()>& inNewProcess);
     ~JobProcess();
     JobProcess(const JobProcess&) = delete;
     JobProcess& operator=(const JobProcess&) = delete;
+
+    /// Closes the copies of its descriptors in another job's process, which needs room for its own. The
+    /// object is of no use there afterwards.
+    void closeCopies();
 
     /// Whether both pipes have been read to their ends.
     [[nodiscard]] bool hasEnded() const { return !_output && !_errors; }

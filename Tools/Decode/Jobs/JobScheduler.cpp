@@ -28,8 +28,12 @@ JobScheduler::JobScheduler(std::size_t count, std::size_t atATime, Job job, Outp
 bool JobScheduler::run() {
     const JobOutlets outlets{_output, _errors};
     bool good = true;
-    for (std::size_t done = 0; done < _count; ++done) {
+    for (std::size_t done = 0; done < _count && _output.isOpen(); ++done) {
         startMore();
+        if (_processes.empty()) {
+            good = _job(_started++, _output) && good;
+            continue;
+        }
         JobProcess& first = *_processes.front();
         if (!first.becomeFirst(outlets, _buffer)) {
             report("what a job has written cannot be read back");
@@ -55,8 +59,23 @@ void JobScheduler::startMore() {
     std::size_t running = 0;
     for (const auto& process : _processes)
         running += process->hasEnded() ? 0 : 1;
-    for (; running < _atATime && _started < _count; ++running)
-        _processes.push_back(std::make_unique<JobProcess>(_started++, _job));
+    while (running < _atATime && _started < _count && start())
+        ++running;
+}
+
+/// Whether there is a process for the next job.
+bool JobScheduler::start() {
+    const auto closeCopies = [this] {
+        for (const auto& process : _processes)
+            process->closeCopies();
+    };
+    try {
+        _processes.push_back(std::make_unique<JobProcess>(_started, _job, closeCopies));
+    } catch (const NoRoomForJob&) {
+        return false; // another attempt follows once a process has ended
+    }
+    ++_started;
+    return true;
 }
 
 /// Waits until a process has written something, or has ended, and reads that.

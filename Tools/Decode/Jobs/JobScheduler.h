@@ -16,7 +16,8 @@ namespace velmora {
 /// Does a number of jobs side by side, each in a process of its own, since the decoders are not made for
 /// several threads. Output and standard error are as if the jobs had been done one after the other: what a
 /// later one writes is kept until it is first in line. A job that ends its process ends those after it, whose
-/// output is dropped. No other thread may run meanwhile.
+/// output is dropped. Where the system has no descriptors or processes for as many jobs, fewer run at a time;
+/// if for none, they are done here. No other thread may run meanwhile.
 class JobScheduler {
 public:
     /// Jobs 0 to `count`-1, up to `atATime` of them running. `output` must outlive this; what it still holds
@@ -28,6 +29,7 @@ public:
 
 private:
     void startMore();
+    [[nodiscard]] bool start();
     void serve();
 
     std::size_t _count;

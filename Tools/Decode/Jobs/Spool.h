@@ -22,6 +22,9 @@ public:
 
     Spool();
 
+    /// In another process: closes its copy of the descriptor.
+    void closeCopy() { _file.reset(); }
+
     [[nodiscard]] bool hasRoom() const { return _file.get() >= 0 && _size < maximumSize; }
 
     /// False where the file did not take all of the text; then none of it is kept.

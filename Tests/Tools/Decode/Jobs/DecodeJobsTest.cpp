@@ -61,6 +61,25 @@ TEST_F(DecodeJobsTest, JobsGoWithoutADirectoryForTemporaryFiles) {
     EXPECT_TRUE(side.output() == serial.output());
 }
 
+TEST_F(DecodeJobsTest, JobsGoWithFewDescriptors) {
+    writeRecording("long.pcapng", "Ostrel_GSM", std::vector<TimedMessage>(5'000, {at(0), rrState(5)}));
+    std::vector<std::string> arguments = {"decode", "--format", "jsonl", "--every", "message"};
+    for (int file = 0; file < 12; ++file)
+        arguments.push_back(path("long.pcapng"));
+    ToolProcess serial(tool(arguments));
+    EXPECT_EQ(serial.exitStatus(), 0);
+    // With 8 there is room for a single job, with 6 for none: they are done without processes.
+    for (const char* descriptors : {"16", "8", "6"}) {
+        std::vector<std::string> words = {
+            "-c", std::string("ulimit -n ") + descriptors + "; exec \"$0\" \"$@\" --jobs 8",
+            VELMORA_BUILD_DIR "/velmora-log"};
+        words.insert(words.end(), arguments.begin(), arguments.end());
+        ToolProcess side(tool(words), "/bin/sh");
+        EXPECT_EQ(side.exitStatus(), 0) << descriptors << ": " << side.errors();
+        EXPECT_TRUE(side.output() == serial.output()) << descriptors;
+    }
+}
+
 TEST_F(DecodeJobsTest, StrictJobThatADecoderEndsEndsThoseAfterIt) {
     writeDrive("a.pcapng");
     const std::vector<std::uint64_t> offsets =
