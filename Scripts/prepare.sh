@@ -9,16 +9,22 @@
 build_packages=(build-essential cmake ninja-build qt6-base-dev libgl-dev libpugixml-dev libcli11-dev
     libutf8proc-dev zlib1g-dev)
 # shellcheck disable=SC2034
-test_packages=(libgtest-dev libgmock-dev libbenchmark-dev nlohmann-json3-dev python3 tshark clang-format-14
+test_packages=(libgtest-dev libgmock-dev librapidcheck-dev libbenchmark-dev nlohmann-json3-dev python3 tshark clang-format-14
     fonts-dejavu-core xvfb dbus at-spi2-core gir1.2-atspi-2.0 python3-gi desktop-file-utils appstream
     modemmanager shellcheck reuse git lintian fakeroot file systemd python3-jsonschema mandoc bash-completion
     mypy)
 # shellcheck disable=SC2034
 fuzz_packages=(clang libclang-rt-14-dev)
 # shellcheck disable=SC2034
+valgrind_packages=(valgrind)
+# shellcheck disable=SC2034
+arm64_packages=(g++-aarch64-linux-gnu qemu-user)
+# shellcheck disable=SC2034
 cppcheck_packages=(cppcheck git)
 # shellcheck disable=SC2034
 lint_packages=(clang-tidy)
+
+under=() # see run_programs
 
 say() { printf '%s\n' "$*" >&2; }
 
@@ -97,4 +103,43 @@ build() {
     fi
     trap - INT
     return "$result"
+}
+
+# run_programs DIRECTORY TEST... -- ARGUMENT...: the test programs of a tree, each as a whole, several in parallel. The
+# array `under` may hold a program that runs them. Prints how many cases each has, and all output of those that fail.
+run_programs() {
+    local directory=$1 programs=() program running=0 result=0
+    shift
+    while [ "$1" != -- ]; do
+        programs+=("$1")
+        shift
+    done
+    shift
+    for program in "${programs[@]}"; do
+        if [ "$running" -ge "$(nproc)" ]; then
+            wait -n || result=1
+            running=$((running - 1))
+        fi
+        run_program "$directory" "$program" "$@" &
+        running=$((running + 1))
+    done
+    while [ "$running" -gt 0 ]; do
+        wait -n || result=1
+        running=$((running - 1))
+    done
+    return "$result"
+}
+
+# run_program DIRECTORY TEST ARGUMENT...: one of them.
+run_program() {
+    local directory=$1 program=$2
+    local log=$directory/$program.log
+    shift 2
+    if "${under[@]}" "$directory/tests/$program" --gtest_brief=1 "$@" >"$log" 2>&1; then
+        say "$program: $(sed -n 's/^\[==========\] //p' "$log" | tail -n 1)"
+    else
+        say "$program failed, with status $?:"
+        cat "$log" >&2
+        return 1
+    fi
 }

@@ -38,6 +38,13 @@ elseif(CMAKE_BUILD_TYPE MATCHES "Rel")
     target_link_options(velmora_options INTERFACE -Wl,--as-needed)
 endif()
 
+if(VELMORA_EMULATED)
+    # Part of linking, so that it is done again whenever a program is linked again. Nothing needs to know the emulator then.
+    list(JOIN CMAKE_CROSSCOMPILING_EMULATOR " " emulator)
+    list(APPEND CMAKE_CXX_LINK_EXECUTABLE "${PROJECT_SOURCE_DIR}/Scripts/wrap-emulated <TARGET> ${emulator}")
+    set(CMAKE_CROSSCOMPILING_EMULATOR)
+endif()
+
 # velmora_library(NAME SOURCES file... [LINK target...]): a static library; what it links is all it may include.
 function(velmora_library name)
     cmake_parse_arguments(PARSE_ARGV 1 arg "" "" "SOURCES;LINK")
@@ -47,7 +54,7 @@ endfunction()
 
 # velmora_generate_from_sections(OUTPUT TABLE [TEMPLATE file]): a file that list-sections (in Tools/ListSections) prints,
 # again whenever a section changes. A file that comes out the same is left alone, so that nothing that uses it is built
-# again. The program has to run on the machine that builds: set CMAKE_CROSSCOMPILING_EMULATOR to build for another kind.
+# again. The program has to run on the machine that builds: a toolchain file for another kind names an emulator.
 function(velmora_generate_from_sections output table)
     cmake_parse_arguments(PARSE_ARGV 2 arg "" "TEMPLATE" "")
     set(input)
@@ -58,7 +65,7 @@ function(velmora_generate_from_sections output table)
     set(printed ${CMAKE_BINARY_DIR}/generated/${name}.new)
     file(MAKE_DIRECTORY ${CMAKE_BINARY_DIR}/generated)
     add_custom_command(OUTPUT ${output} BYPRODUCTS ${printed}
-                       COMMAND list-sections ${table} ${input} > ${printed}
+                       COMMAND ${CMAKE_CROSSCOMPILING_EMULATOR} $<TARGET_FILE:list-sections> ${table} ${input} > ${printed}
                        COMMAND ${CMAKE_COMMAND} -E copy_if_different ${printed} ${output}
                        DEPENDS list-sections ${arg_TEMPLATE}
                        COMMENT "Generating ${name} from the sections" VERBATIM)
@@ -76,6 +83,12 @@ function(velmora_uses_regex)
         set_source_files_properties(${ARGN} PROPERTIES COMPILE_OPTIONS -Wno-maybe-uninitialized)
     endif()
 endfunction()
+
+# In seconds, of a case.
+set(velmora_test_timeout 60)
+if(VELMORA_EMULATED)
+    set(velmora_test_timeout 900)
+endif()
 
 # The tests whose code, or the code that they test, starts threads. ./test --threads runs them with the thread sanitizer.
 set(velmora_threaded_tests test-model test-platform-linux test-recording test-tools)
@@ -104,7 +117,7 @@ function(velmora_test name)
     endif()
     include(GoogleTest)
     gtest_discover_tests(${name} TEST_PREFIX "${name}." NO_PRETTY_VALUES DISCOVERY_MODE PRE_TEST
-                         PROPERTIES TIMEOUT 60 ${labels})
+                         PROPERTIES TIMEOUT ${velmora_test_timeout} ${labels})
 endfunction()
 
 # velmora_python_tests(NAME PACKAGE [SCRIPT...]): runs the unit tests of a Python package of this folder, and, where mypy

@@ -9,6 +9,7 @@
 #include "Platform/TelephonyService.h"
 #include "PropertyLists/PropertyList.h"
 #include "Tests/Support/Hex.h"
+#include "Tests/Support/OwnProgram.h"
 
 #include <csignal>
 #include <cstdio>
@@ -122,7 +123,7 @@ SocketService::SocketService(const std::string& directory, const std::string& ma
         ::dup2(ready[1], STDOUT_FILENO);
         ::close(ready[0]);
         ::close(ready[1]);
-        ::execl("/proc/self/exe", "service", "--service", directory.c_str(), manner.c_str(), nullptr);
+        ::execl(ownProgram(), "service", "--service", directory.c_str(), manner.c_str(), nullptr);
         ::_exit(127);
     }
     ::close(ready[1]);

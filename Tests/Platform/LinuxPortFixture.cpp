@@ -4,6 +4,7 @@
 #include "Tests/Platform/LinuxPortFixture.h"
 
 #include "Platform/Linux/LoopTimer.h"
+#include "Tests/Support/OwnProgram.h"
 
 #include <poll.h>
 #include <sys/socket.h>
@@ -45,7 +46,7 @@ EchoProcess::EchoProcess(const std::string& directory, const std::string& name) 
     if (_id == 0) {
         ::dup2(ends[1], STDOUT_FILENO);
         ::close(ends[0]);
-        ::execl("/proc/self/exe", "echo-process", "--echo", directory.c_str(), name.c_str(), nullptr);
+        ::execl(ownProgram(), "echo-process", "--echo", directory.c_str(), name.c_str(), nullptr);
         ::_exit(127);
     }
     ::close(ends[1]);

@@ -8,6 +8,7 @@
 #include "Tests/Support/FakeClock.h"
 #include "Tests/Support/Hex.h"
 #include "Tests/Support/NotifySocket.h"
+#include "Tests/Support/OwnProgram.h"
 #include "Tests/Support/TemporaryDirectory.h"
 
 #include <gmock/gmock.h>
@@ -118,7 +119,7 @@ TEST_F(TelephonydTest, survivesAClientThatIsKilled) {
     ASSERT_TRUE(other.connect());
     ASSERT_TRUE(other.stream());
 
-    TestProcess victim("/proc/self/exe", {"--client", directory.path().string(), "com.velmora.test.victim"},
+    TestProcess victim(ownProgram(), {"--client", directory.path().string(), "com.velmora.test.victim"},
                        directory.path());
     ASSERT_TRUE(eventually([&] { return victim.standardOutput() == "streaming\n"; }));
     EXPECT_EQ(serviceSockets().size(), 3U);
