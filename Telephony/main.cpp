@@ -66,7 +66,7 @@ int serve(const Options& options, const velmora::SourceChoice& choice) {
     LinuxMessagePorts ports;
     const ServiceManager manager;
 
-    const auto source = makeSource(choice, queue, clock);
+    const auto source = makeSource(choice, queue, clock, [] { return SignalWatcher::hasSignal(); });
     if (!source) {
         std::fprintf(stderr, "%s: %s\n", program, source.reason().c_str());
         return badInput;
