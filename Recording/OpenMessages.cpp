@@ -73,9 +73,8 @@ Result<std::unique_ptr<MessageReader>> openUnpacked(ChunkedInput input) {
 
 } // namespace
 
-Result<std::unique_ptr<MessageReader>> openMessages(const std::string& path,
-                                                    std::function<void()> beforeWaiting) {
-    Result<std::unique_ptr<ByteSource>> source = FileSource::open(path, std::move(beforeWaiting));
+Result<std::unique_ptr<MessageReader>> openMessages(const std::string& path, FileSource::Hooks hooks) {
+    Result<std::unique_ptr<ByteSource>> source = FileSource::open(path, std::move(hooks));
     if (!source)
         return Failure{source.reason()};
     return openMessages(ChunkedInput(*std::move(source)));

@@ -5,9 +5,9 @@
 
 #include "Platform/Result.h"
 #include "Recording/Files/ChunkedInput.h"
+#include "Recording/Files/FileSource.h"
 #include "Recording/MessageReader.h"
 
-#include <functional>
 #include <memory>
 #include <string>
 #include <vector>
@@ -17,10 +17,11 @@ namespace velmora {
 /// Opens a file of log messages - a recording, a snapshot, a DLF log - recognising its form by its first
 /// bytes, never by its name. A gzip'd one is unpacked as it is read. "-" is standard input. The reason does
 /// not repeat the path.
-/// `beforeWaiting` is called, in calls of the reader, whenever it waits for more of the input; it may be
-/// null.
-Result<std::unique_ptr<MessageReader>> openMessages(const std::string& path,
-                                                    std::function<void()> beforeWaiting = {});
+/// The hooks are called in calls of the reader.
+Result<std::unique_ptr<MessageReader>> openMessages(const std::string& path, FileSource::Hooks hooks);
+inline Result<std::unique_ptr<MessageReader>> openMessages(const std::string& path) {
+    return openMessages(path, FileSource::Hooks());
+}
 /// As above, for an input of which nothing has been skipped.
 Result<std::unique_ptr<MessageReader>> openMessages(ChunkedInput input);
 

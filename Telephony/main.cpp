@@ -74,7 +74,7 @@ int serve(const Options& options, const velmora::SourceChoice& choice) {
     LinuxMessagePorts ports;
     const ServiceManager manager;
 
-    const auto source = makeSource(choice, queue, clock);
+    const auto source = makeSource(choice, queue, clock, [] { return SignalWatcher::hasSignal(); });
     if (!source) {
         complain(source.reason());
         return badInput;

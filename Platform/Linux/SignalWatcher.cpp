@@ -17,13 +17,15 @@ namespace {
 
 // A handler has no other way to find the pipe.
 std::atomic<int> signalPipe = -1;
+std::atomic<int> waitingSignals = 0; ///< in the pipe
 static_assert(std::atomic<int>::is_always_lock_free, "a signal handler may use nothing else");
 
 extern "C" void velmoraForwardSignal(int signalNumber) {
     const int error = errno;
     const auto byte = static_cast<unsigned char>(signalNumber);
     // A full pipe already holds more signals than are needed.
-    [[maybe_unused]] const auto written = ::write(signalPipe.load(), &byte, 1);
+    if (::write(signalPipe.load(), &byte, 1) == 1)
+        ++waitingSignals;
     errno = error;
 }
 
@@ -62,6 +64,11 @@ SignalWatcher::~SignalWatcher() {
     ::sigaction(SIGHUP, &_earlierHangUp, nullptr);
     ::sigaction(SIGPIPE, &_earlierPipe, nullptr);
     signalPipe = -1;
+    waitingSignals = 0;
+}
+
+bool SignalWatcher::hasSignal() {
+    return waitingSignals.load() > 0;
 }
 
 void SignalWatcher::takeSignals() {
@@ -70,6 +77,7 @@ void SignalWatcher::takeSignals() {
     unsigned char signalNumber = 0;
     if (::read(_readEnd.get(), &signalNumber, 1) != 1)
         return;
+    --waitingSignals;
     const auto callback = _callback;
     (*callback)(signalNumber);
 }

@@ -28,6 +28,9 @@ public:
     SignalWatcher(const SignalWatcher&) = delete;
     SignalWatcher& operator=(const SignalWatcher&) = delete;
 
+    /// Whether a signal has arrived that the callback has not been called for: for work that takes long.
+    [[nodiscard]] static bool hasSignal();
+
 private:
     void takeSignals();
 

@@ -13,20 +13,18 @@
 
 namespace velmora {
 
-Result<std::unique_ptr<ByteSource>> FileSource::open(const std::string& path,
-                                                     std::function<void()> beforeWaiting) {
+Result<std::unique_ptr<ByteSource>> FileSource::open(const std::string& path, Hooks hooks) {
     if (path == "-")
         return std::unique_ptr<ByteSource>(
-            std::make_unique<FileSource>(STDIN_FILENO, false, std::move(beforeWaiting)));
+            std::make_unique<FileSource>(STDIN_FILENO, false, std::move(hooks)));
     const int descriptor = ::open(path.c_str(), O_RDONLY | O_CLOEXEC);
     if (descriptor < 0)
         return Failure{"cannot open: " + std::generic_category().message(errno)};
-    return std::unique_ptr<ByteSource>(
-        std::make_unique<FileSource>(descriptor, true, std::move(beforeWaiting)));
+    return std::unique_ptr<ByteSource>(std::make_unique<FileSource>(descriptor, true, std::move(hooks)));
 }
 
-FileSource::FileSource(int descriptor, bool owned, std::function<void()> beforeWaiting)
-    : _descriptor(descriptor), _owned(owned), _beforeWaiting(std::move(beforeWaiting)) {}
+FileSource::FileSource(int descriptor, bool owned, Hooks hooks)
+    : _descriptor(descriptor), _owned(owned), _hooks(std::move(hooks)) {}
 
 FileSource::~FileSource() {
     if (_owned)
@@ -34,15 +32,19 @@ FileSource::~FileSource() {
 }
 
 Result<std::size_t> FileSource::read(std::span<std::uint8_t> buffer) {
-    if (_beforeWaiting) {
+    if (_hooks.mayRead && !_hooks.mayRead(_offset))
+        return Failure{"interrupted"};
+    if (_hooks.beforeWaiting) {
         pollfd readable{_descriptor, POLLIN, 0};
         if (::poll(&readable, 1, 0) == 0)
-            _beforeWaiting();
+            _hooks.beforeWaiting();
     }
     for (;;) {
         const ssize_t count = ::read(_descriptor, buffer.data(), buffer.size());
-        if (count >= 0)
+        if (count >= 0) {
+            _offset += static_cast<std::uint64_t>(count);
             return static_cast<std::size_t>(count);
+        }
         if (errno == EAGAIN || errno == EWOULDBLOCK) {
             // Standard input may have been made non-blocking by another process that shares it.
             pollfd readable{_descriptor, POLLIN, 0};

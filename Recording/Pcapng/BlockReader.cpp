@@ -9,6 +9,7 @@
 
 #include <algorithm>
 #include <array>
+#include <cstring>
 #include <limits>
 
 namespace velmora {
@@ -24,6 +25,17 @@ constexpr std::array<std::uint8_t, 4> littleEndianMagic{0x4D, 0x3C, 0x2B, 0x1A};
 
 bool startsWith(Bytes bytes, const std::array<std::uint8_t, 4>& word) {
     return bytes.size() >= word.size() && std::equal(word.begin(), word.end(), bytes.begin());
+}
+
+/// How many bytes of the zeros that the input begins with can be skipped: no block begins with four of them,
+/// and the position within a word stays. A hole of a sparse file is many zeros.
+std::size_t skippableZeros(Bytes bytes) {
+    constexpr std::array<std::uint8_t, 1024> zeros{};
+    std::size_t count = 0;
+    while (bytes.size() - count >= zeros.size() &&
+           std::memcmp(bytes.data() + count, zeros.data(), zeros.size()) == 0)
+        count += zeros.size();
+    return count == 0 ? 0 : count - 4;
 }
 
 /// The least length of a block that damage may be left at; types that are not known are not trusted there.
@@ -127,6 +139,7 @@ void BlockReader::skipDamage(Fault fault, const Block& block) {
     loss.reason = describe(fault, block);
     bool found = false;
     for (unsigned phase = 1; !found && _input.ensure(1); phase = (phase + 1) % 4) {
+        _input.skip(skippableZeros(_input.available()));
         _input.skip(1);
         if (phase == 0 || startsWith(_input.available(), sectionHeaderWord))
             found = isAtBlock();

@@ -10,6 +10,7 @@
 #include "Telephony/Sources/ReplaySource.h"
 #include "Telephony/Sources/ScenarioSource.h"
 
+#include <cstdint>
 #include <utility>
 
 namespace velmora {
@@ -17,7 +18,9 @@ namespace {
 
 using Made = Result<std::unique_ptr<LogSource>>;
 
-Made make(const ScenarioChoice& choice, MainQueue& queue, const Clock& clock) {
+using IsStopping = std::function<bool()>;
+
+Made make(const ScenarioChoice& choice, MainQueue& queue, const Clock& clock, const IsStopping&) {
     const ScenarioKind* kind = scenarioKindNamed(choice.name);
     if (!kind)
         return Failure{"scenario is \"" + choice.name + "\", wanted one of: " + scenarioNames()};
@@ -26,8 +29,13 @@ Made make(const ScenarioChoice& choice, MainQueue& queue, const Clock& clock) {
         std::make_unique<ScenarioSource>(queue, clock, std::move(makeScenario), choice.speed));
 }
 
-Made make(const ReplayChoice& choice, MainQueue& queue, const Clock& clock) {
-    auto open = [file = choice.file] { return openMessages(file); };
+Made make(const ReplayChoice& choice, MainQueue& queue, const Clock& clock, const IsStopping& isStopping) {
+    auto open = [file = choice.file, isStopping] {
+        // What is damaged is read in one call, however long it is.
+        FileSource::Hooks hooks;
+        hooks.mayRead = [isStopping](std::uint64_t) { return !isStopping || !isStopping(); };
+        return openMessages(file, std::move(hooks));
+    };
     auto source = ReplaySource::create(queue, clock, choice.file, std::move(open),
                                        {choice.speed, choice.loop, choice.technology});
     if (!source)
@@ -35,7 +43,7 @@ Made make(const ReplayChoice& choice, MainQueue& queue, const Clock& clock) {
     return std::unique_ptr<LogSource>(*std::move(source));
 }
 
-Made make(const ModemManagerChoice& choice, MainQueue& queue, const Clock& clock) {
+Made make(const ModemManagerChoice& choice, MainQueue& queue, const Clock& clock, const IsStopping&) {
     return std::unique_ptr<LogSource>(
         std::make_unique<ModemManagerSource>(queue, clock, ModemFollower::Options{choice.modem, {}}));
 }
@@ -43,8 +51,8 @@ Made make(const ModemManagerChoice& choice, MainQueue& queue, const Clock& clock
 } // namespace
 
 Result<std::unique_ptr<LogSource>> makeSource(const SourceChoice& choice, MainQueue& queue,
-                                              const Clock& clock) {
-    return std::visit([&](const auto& chosen) { return make(chosen, queue, clock); }, choice);
+                                              const Clock& clock, const std::function<bool()>& isStopping) {
+    return std::visit([&](const auto& chosen) { return make(chosen, queue, clock, isStopping); }, choice);
 }
 
 std::string sourceHelp(std::string_view program) {

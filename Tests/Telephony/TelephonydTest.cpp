@@ -15,10 +15,15 @@
 #include <gtest/gtest.h>
 
 #include <algorithm>
+#include <chrono>
 #include <csignal>
+#include <cstdint>
 #include <cstdlib>
+#include <filesystem>
 #include <fstream>
 #include <memory>
+#include <string>
+#include <thread>
 
 namespace velmora {
 namespace {
@@ -102,6 +107,27 @@ TEST_F(TelephonydTest, notifiesTheServiceManagerOfReadinessAndStop) {
     service->signal(SIGTERM);
     EXPECT_EQ(service->exitStatus(), 0);
     EXPECT_THAT(manager.take(), ElementsAre("STOPPING=1"));
+}
+
+TEST_F(TelephonydTest, stopsAtOnceInTheHoleOfASparseFile) {
+    const std::string file = directory / "sparse.pcapng";
+    {
+        auto writer = PcapngWriter::create(file, "Ostrel_GSM");
+        ASSERT_TRUE(writer);
+        ASSERT_TRUE((*writer)->append(Time(), hex("01 02 03").bytes()));
+    }
+    std::filesystem::resize_file(file, std::uintmax_t{12} << 30); // which takes no room
+    const auto service = start({"--source", "replay:" + file + ",speed=0", "--log-level", "5"});
+    TestClient client(directory.path(), "com.velmora.test.client");
+    ASSERT_TRUE(client.connect());
+    ASSERT_TRUE(client.stream());
+    ASSERT_TRUE(
+        eventually([&] { return service->standardError().find(": streaming to ") != std::string::npos; }));
+    std::this_thread::sleep_for(std::chrono::milliseconds(300)); // it reads the hole by then
+    const auto begin = std::chrono::steady_clock::now();
+    service->signal(SIGTERM);
+    EXPECT_EQ(service->exitStatus(), 0);
+    EXPECT_LT(std::chrono::steady_clock::now() - begin, std::chrono::seconds(1));
 }
 
 TEST_F(TelephonydTest, takesItsSourceFromTheEnvironmentToo) {

@@ -22,9 +22,11 @@
 #include "Tools/Report.h"
 
 #include <algorithm>
+#include <cstdint>
 #include <memory>
 #include <optional>
 #include <string>
+#include <utility>
 #include <vector>
 
 #include <unistd.h>
@@ -112,17 +114,24 @@ bool decodeFile(std::size_t index, const DecodeOptions& options, bool showsProgr
     DecodingRequest request = requestFor(path, options, technologies);
     // What has been decoded is written before more is waited for: at the other end a reader may wait for it.
     std::unique_ptr<DecodeWriter> writer;
-    const Result<std::unique_ptr<MessageReader>> reader = openMessages(path, [&writer] {
+    std::optional<ShownProgress> progress;
+    FileSource::Hooks hooks;
+    hooks.beforeWaiting = [&writer] {
         if (writer)
             writer->flush();
-    });
+    };
+    hooks.mayRead = [&progress](std::uint64_t offset) {
+        if (progress && progress->get())
+            progress->get()->at(offset);
+        return true;
+    };
+    const Result<std::unique_ptr<MessageReader>> reader = openMessages(path, std::move(hooks));
     if (!reader) {
         report(title + ": " + reader.reason());
         return false;
     }
     const bool isLive = !inputSize(path);
     writer = DecodeWriter::make(options, index, isLive, columns, output);
-    std::optional<ShownProgress> progress;
     if (showsProgress)
         progress.emplace(**reader, path, options);
     const auto clearProgress = [&progress] {

@@ -9,6 +9,9 @@
 
 #include <gmock/gmock.h>
 
+#include <chrono>
+#include <csignal>
+#include <cstdint>
 #include <filesystem>
 #include <fstream>
 #include <vector>
@@ -90,6 +93,19 @@ TEST_F(DecodeProgressProgramTest, ProgressOfLongInputShowsOnATerminalAlone) {
     EXPECT_NE(errors.find(cleared, last), std::string::npos) << errors;
     EXPECT_EQ(errorsOf("long.pcapng", false).find(shown), std::string::npos);
     EXPECT_EQ(errorsOf("short.pcapng", true).find(shown), std::string::npos);
+}
+
+TEST_F(DecodeProgressProgramTest, ProgressShowsInTheHoleOfASparseFileAsWell) {
+    writeLargeRecording("sparse.pcapng", 1);
+    std::filesystem::resize_file(path("sparse.pcapng"), std::uintmax_t{12} << 30); // which takes no room
+    ToolProcess::Setup setup = tool({"decode", path("sparse.pcapng")});
+    setup.errorsOnTerminal = true;
+    ToolProcess process(setup);
+    ASSERT_TRUE(process.waitForError(" MiB/s, "));
+    const auto begin = std::chrono::steady_clock::now();
+    process.signal(SIGTERM);
+    EXPECT_EQ(process.exitStatus(), 128 + SIGTERM);
+    EXPECT_LT(std::chrono::steady_clock::now() - begin, std::chrono::seconds(1));
 }
 
 } // namespace
