@@ -51,10 +51,10 @@ protected:
     DecoderLines _lines{false};
     NodeRef _lastDisplay;
     int _redraws = 0;
-    std::shared_ptr<WatchModel> _model = std::make_shared<WatchModel>(
-        ModelPlatform{_ports, _queue, _telephony, _clock,
-                      [] { return std::optional<std::string>(localName); }},
-        this, _lines, WatchModel::Events{[](std::string_view) {}, [](std::string_view) {}});
+    std::shared_ptr<WatchModel> _model =
+        std::make_shared<WatchModel>(ModelPlatform{_ports, _queue, _telephony, _clock,
+                                                   [] { return std::optional<std::string>(localName); }},
+                                     this, _lines, WatchModel::Events{[](std::string_view) {}});
 };
 
 INSTANTIATE_TEST_SUITE_P(Technologies, WatchModelTest,
