@@ -48,7 +48,7 @@ std::optional<RecordBuilder> registration(ModemReportContext& context) {
         account->set(kVoxRegistrationPLMN, codeOf(phone.serving->area.plmn));
         account->set(kVoxRegistrationOperator, nameOf(phone.serving->area.plmn));
     }
-    account->set(kVoxRegistrationPacketService, phone.isRegistered() ? 1 : 2); // attached, detached
+    account->set(kVoxRegistrationPacketService, phone.isRegistered() ? 2 : 1); // attached, detached
     return modemMessage(LiveModemCode::registration, account);
 }
 
