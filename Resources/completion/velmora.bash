@@ -45,7 +45,7 @@ _velmora_source() {
     local source=$cur head=${cur%,*},
     case $source in
     scenario:*,*) _velmora_offer "${head}seed=" "${head}speed=" ;;
-    scenario:*) _velmora_offer scenario:{gsm,c2k,lte,utran,ifx} ;;
+    scenario:*) _velmora_offer scenario:{gsm,c2k,lte,utran,ifx,modem} ;;
     replay:*,technology=*)
         # What stands before the equals sign is a word of its own to bash.
         cur=${cur##*=}
