@@ -8,7 +8,7 @@
 namespace velmora {
 
 /// "Packet Data Contexts": the bearers with their addresses, a row each.
-class ModemContexts final : public ModemSection {
+class ModemContexts final : public ModemSectionOf<ModemContexts> {
 public:
     [[nodiscard]] std::string_view getSectionName() const override { return "Packet Data Contexts"; }
     [[nodiscard]] std::span<const View> views() const override;

@@ -8,7 +8,7 @@
 namespace velmora {
 
 /// "Modem": the modem itself.
-class ModemEquipment final : public ModemSection {
+class ModemEquipment final : public ModemSectionOf<ModemEquipment> {
 public:
     [[nodiscard]] std::string_view getSectionName() const override { return "Modem"; }
     [[nodiscard]] std::span<const View> views() const override;

@@ -8,7 +8,7 @@
 namespace velmora {
 
 /// "Link": access technologies, signal quality and every level, by radio technology.
-class ModemLink final : public ModemSection {
+class ModemLink final : public ModemSectionOf<ModemLink> {
 public:
     [[nodiscard]] std::string_view getSectionName() const override { return "Link"; }
     [[nodiscard]] std::span<const View> views() const override;

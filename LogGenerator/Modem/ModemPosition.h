@@ -8,7 +8,7 @@
 namespace velmora {
 
 /// "Position": where the modem is, as its receiver of satellites says.
-class ModemPosition final : public ModemSection {
+class ModemPosition final : public ModemSectionOf<ModemPosition> {
 public:
     [[nodiscard]] std::string_view getSectionName() const override { return "Position"; }
     [[nodiscard]] std::span<const View> views() const override;

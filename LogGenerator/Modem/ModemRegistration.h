@@ -8,7 +8,7 @@
 namespace velmora {
 
 /// "Registration": whether and where the modem is registered.
-class ModemRegistration final : public ModemSection {
+class ModemRegistration final : public ModemSectionOf<ModemRegistration> {
 public:
     [[nodiscard]] std::string_view getSectionName() const override { return "Registration"; }
     [[nodiscard]] std::span<const View> views() const override;

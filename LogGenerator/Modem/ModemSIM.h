@@ -8,7 +8,7 @@
 namespace velmora {
 
 /// "SIM": the SIM that is in use.
-class ModemSIM final : public ModemSection {
+class ModemSIM final : public ModemSectionOf<ModemSIM> {
 public:
     [[nodiscard]] std::string_view getSectionName() const override { return "SIM"; }
     [[nodiscard]] std::span<const View> views() const override;

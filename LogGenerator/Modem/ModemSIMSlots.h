@@ -8,7 +8,7 @@
 namespace velmora {
 
 /// "SIM Slots": the slots of a modem that has several, a row each.
-class ModemSIMSlots final : public ModemSection {
+class ModemSIMSlots final : public ModemSectionOf<ModemSIMSlots> {
 public:
     [[nodiscard]] std::string_view getSectionName() const override { return "SIM Slots"; }
     [[nodiscard]] std::span<const View> views() const override;

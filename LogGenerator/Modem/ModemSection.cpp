@@ -5,20 +5,13 @@
 
 #include "LogGenerator/Modem/ModemStatus.h"
 #include "LogGenerator/Modem/Values/TypedValue.h"
-#include "LogGenerator/Modem/Values/ValueRow.h"
+#include "LogGenerator/Observations/ContentVisitor.h"
 #include "LogMessages/LiveModem.h"
 #include "Platform/SystemLog.h"
 
 namespace velmora {
 
 using LiveModem::dictionaryOf;
-
-namespace {
-
-constexpr Field state{"State", computed, plainText()};
-constexpr LiveModem::ValueRow reason{kVoxModemReason, {"Reason", computed, plainText()}};
-
-} // namespace
 
 void ModemSection::updateWithData(const Data& data, std::uint32_t logCode) {
     trace();
@@ -51,17 +44,18 @@ void ModemSection::decode(const View&, const Record&, FieldVisitor& visitor) con
     const std::optional<std::string> trouble = LiveModem::troubleOf(message);
     visitor.beginWhole();
     if (_message.isNone())
-        visitor.text(state, "Unreadable message");
+        visitor.text(_state, "Unreadable message");
     else
-        visitor.text(state, trouble ? *trouble : stateOf(message));
-    LiveModem::visitValue(message[reason.key], reason, visitor);
+        visitor.text(_state, trouble ? *trouble : stateOf(message));
+    if (const auto reason = LiveModem::textOf(message[kVoxModemReason]))
+        visitor.text(_reason, *reason);
     show(LiveModem::isModemAbsent(message) ? dictionaryOf({}) : message, visitor);
     visitor.endWhole();
 }
 
 void ModemSection::describe(const View&, ContentVisitor& visitor) const {
-    visitor.field(state);
-    visitor.field(reason.field);
+    visitor.field(_state);
+    visitor.field(_reason);
     describeShown(visitor);
 }
 

@@ -38,11 +38,30 @@ protected:
     virtual void checkMessage(const Dictionary& message) const;
 
 private:
+    /// The first rows of a section, each section's own: what they show is another value in each.
+    template <class Section>
+    static constexpr Field stateField{"State", computed, plainText()};
+    template <class Section>
+    static constexpr Field reasonField{"Reason", computed, plainText()};
+
+    template <class Section>
+    friend class ModemSectionOf;
+    ModemSection(const Field& state, const Field& reason) : _state(state), _reason(reason) {}
+
     /// The message's dictionary; none where it cannot be read.
     [[nodiscard]] Value read(const Data& data, std::uint32_t logCode) const;
 
+    const Field& _state;
+    const Field& _reason;
     std::shared_ptr<PayloadCache> _payloads = std::make_shared<PayloadCache>();
     Value _message; ///< of the record that is kept
+};
+
+/// What a section derives from, with itself as the argument.
+template <class Section>
+class ModemSectionOf : public ModemSection {
+protected:
+    ModemSectionOf() : ModemSection(stateField<Section>, reasonField<Section>) {}
 };
 
 } // namespace velmora

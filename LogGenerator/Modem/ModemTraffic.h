@@ -8,7 +8,7 @@
 namespace velmora {
 
 /// "Traffic": the counters and rates of the connected bearers, a row each.
-class ModemTraffic final : public ModemSection {
+class ModemTraffic final : public ModemSectionOf<ModemTraffic> {
 public:
     [[nodiscard]] std::string_view getSectionName() const override { return "Traffic"; }
     [[nodiscard]] std::span<const View> views() const override;

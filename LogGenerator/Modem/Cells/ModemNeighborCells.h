@@ -8,7 +8,7 @@
 namespace velmora {
 
 /// "Neighbor Cells": the neighbours of any radio technology, by falling level.
-class ModemNeighborCells final : public ModemSection {
+class ModemNeighborCells final : public ModemSectionOf<ModemNeighborCells> {
 public:
     [[nodiscard]] std::string_view getSectionName() const override { return "Neighbor Cells"; }
     [[nodiscard]] std::span<const View> views() const override;

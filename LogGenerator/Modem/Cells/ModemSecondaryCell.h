@@ -8,7 +8,7 @@
 namespace velmora {
 
 /// "Secondary Cell": the second serving cell: that of NR in 5G non-standalone.
-class ModemSecondaryCell final : public ModemSection {
+class ModemSecondaryCell final : public ModemSectionOf<ModemSecondaryCell> {
 public:
     [[nodiscard]] std::string_view getSectionName() const override { return "Secondary Cell"; }
     [[nodiscard]] std::span<const View> views() const override;

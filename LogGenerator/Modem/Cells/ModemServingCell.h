@@ -8,7 +8,7 @@
 namespace velmora {
 
 /// "Serving Cell": the first serving cell, whatever its radio technology.
-class ModemServingCell final : public ModemSection {
+class ModemServingCell final : public ModemSectionOf<ModemServingCell> {
 public:
     [[nodiscard]] std::string_view getSectionName() const override { return "Serving Cell"; }
     [[nodiscard]] std::span<const View> views() const override;
