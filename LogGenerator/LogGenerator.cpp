@@ -7,6 +7,7 @@
 #include "LogGenerator/GSM/GSMLogGenerator.h"
 #include "LogGenerator/LTE/LTELogGenerator.h"
 #include "LogGenerator/MessageEffects.h"
+#include "LogGenerator/Modem/ModemLogGenerator.h"
 #include "LogGenerator/Observations/Observer.h"
 #include "LogGenerator/OstrelGSM/Ostrel_GSMLogGenerator.h"
 #include "LogGenerator/UTRAN/UTRANLogGenerator.h"
@@ -48,6 +49,7 @@ void LogGenerator::setObservationSink(ObservationSink* sink) {
         static_cast<void>(catalogue());
         if (!_observer)
             _observer = std::make_unique<Observer>();
+        _observer->assumeAllShown();
     }
     observe(observer());
 }
@@ -73,6 +75,8 @@ std::unique_ptr<LogGenerator> LogGenerator::generatorFromTechnology(std::string_
         return LTELogGenerator::generator(clock);
     if (technology == kVoxLogChannelTechnology_Ostrel_UTRAN2)
         return UTRANLogGenerator::generator(clock);
+    if (technology == kVoxLogChannelTechnology_Modem)
+        return ModemLogGenerator::generator(clock);
     return nullptr;
 }
 

@@ -57,7 +57,7 @@ inline constexpr std::string_view kVoxLogChannelTechnology_Modem = "kVoxLogChann
 inline constexpr std::array voxTechnologies = {
     kVoxLogChannelTechnology_IFX,           kVoxLogChannelTechnology_Ostrel_GSM,
     kVoxLogChannelTechnology_Ostrel_CDMA,   kVoxLogChannelTechnology_Ostrel_LTE,
-    kVoxLogChannelTechnology_Ostrel_UTRAN2,
+    kVoxLogChannelTechnology_Ostrel_UTRAN2, kVoxLogChannelTechnology_Modem,
 };
 
 /// The prefix of a technology's short name ("Ostrel_GSM") in the service's constant.

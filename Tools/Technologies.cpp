@@ -24,6 +24,7 @@ constexpr std::array forms = {
     Form{"CDMA", kVoxLogChannelTechnology_Ostrel_CDMA},
     Form{"LTE", kVoxLogChannelTechnology_Ostrel_LTE},
     Form{"UTRAN", kVoxLogChannelTechnology_Ostrel_UTRAN2},
+    Form{"Modem", kVoxLogChannelTechnology_Modem},
 };
 static_assert(forms.size() == voxTechnologies.size());
 

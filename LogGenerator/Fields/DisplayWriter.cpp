@@ -85,6 +85,18 @@ void DisplayWriter::removed(std::string_view label) {
         node->remove(label);
 }
 
+void DisplayWriter::beginWhole() {
+    // Written like a row, so that the order is that of the account, whatever there was before.
+    level().isRow = level().dictionary != nullptr;
+    level().next = 0;
+}
+
+void DisplayWriter::endWhole() {
+    if (level().isRow)
+        level().dictionary->truncate(level().next);
+    level().isRow = false;
+}
+
 void DisplayWriter::beginList(const List& list) {
     Level& to = level();
     Array* target = nullptr;

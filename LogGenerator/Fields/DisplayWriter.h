@@ -32,6 +32,8 @@ public:
     void text(const Field& field, std::string_view text) override;
     void supplied(const Field& field, const Value& value) override;
     void removed(std::string_view label) override;
+    void beginWhole() override;
+    void endWhole() override;
 
     void beginList(const List& list) override;
     void beginRow() override;
@@ -46,7 +48,7 @@ private:
         Dictionary* dictionary = nullptr;
         Array* list = nullptr;
         std::size_t next = 0; ///< the index of the next entry in a list or row
-        bool isRow = false;
+        bool isRow = false;   ///< its entries are written one after another, from `next` on
     };
     /// The section's node, a list, a row, a list in it, and a row there.
     static constexpr std::size_t deepest = 5;

@@ -36,6 +36,12 @@ public:
     /// The field of an earlier record is not valid any more.
     virtual void removed(std::string_view label) = 0;
 
+    /// What follows up to `endWhole` is all that the section's dictionary shows, in this order: what is there
+    /// of earlier records and is not named again is gone. Each label is named once. The default is for
+    /// visitors that no section names its fields to.
+    virtual void beginWhole() {}
+    virtual void endWhole() {}
+
     /// A list begins, which replaces an earlier one; its entries follow. Lists nest in rows.
     virtual void beginList(const List& list) = 0;
     /// A row begins; its fields follow. `List::Entries::Rows` only.

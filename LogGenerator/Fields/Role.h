@@ -20,7 +20,7 @@ enum class Role : std::uint8_t {
     ServingNetworkCode,  ///< MNC, two or three digits
     ServingArea,         ///< location area or tracking area code
     ServingCell,         ///< cell identity
-    ServingChannel,      ///< ARFCN, UARFCN, EARFCN or CDMA channel number of the downlink
+    ServingChannel,      ///< ARFCN, UARFCN, EARFCN, NR-ARFCN or CDMA channel number of the downlink
     ServingPhysicalCell, ///< BSIC, scrambling code, cell parameter ID, PCI or PN offset
     ServingLevel,        ///< dBm
     ServingQuality,      ///< dB

@@ -19,7 +19,13 @@ constexpr SuffixRow suffixes[] = {
     {"%", {Unit::Percent}},
     {"% (old)", {Unit::Percent}},
     {" kbps", {Unit::KilobitPerSecond, 1.024}}, // the display counts 1024 bits as a kilobit
+    {" kbit/s", {Unit::KilobitPerSecond}},
     {" sec", {Unit::Second}},
+    {" s", {Unit::Second}},
+    {" MHz", {Unit::Megahertz}},
+    {" bytes", {Unit::Byte}},
+    {"\u00B0", {Unit::Degree}},
+    {" m", {Unit::Metre}},
     {" \u00D7 64chips", {}}, // a PN offset, which is counted in these
 };
 
@@ -33,6 +39,10 @@ std::string_view nameOf(Unit unit) {
     case Unit::Percent: return "%";
     case Unit::KilobitPerSecond: return "kbit/s";
     case Unit::Second: return "s";
+    case Unit::Megahertz: return "MHz";
+    case Unit::Byte: return "byte";
+    case Unit::Degree: return "\u00B0";
+    case Unit::Metre: return "m";
     }
     return {};
 }

@@ -17,6 +17,10 @@ enum class Unit : std::uint8_t {
     Percent,
     KilobitPerSecond, ///< of 1000 bits
     Second,
+    Megahertz,
+    Byte,
+    Degree, ///< of an angle
+    Metre,
 };
 
 /// The unit as it is written after a number: "dBm", "kbit/s"; empty for `None`.

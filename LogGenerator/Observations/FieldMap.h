@@ -50,6 +50,8 @@ public:
     /// Call it when all have been added, before anything is looked up.
     void sort();
 
+    /// All that have been added.
+    [[nodiscard]] std::span<const Entry> entries() const { return _entries; }
     /// The leaves that show the field; most have one. Fields are looked up fastest in the order of their
     /// tables.
     [[nodiscard]] std::span<const Entry> find(const List* list, const Field& field) const;

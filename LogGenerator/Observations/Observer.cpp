@@ -185,6 +185,30 @@ void Observer::removed(std::string_view label) {
         _removed.push_back(leaf);
 }
 
+void Observer::beginWhole() {
+    _firstOfWhole = _observations.size();
+}
+
+void Observer::endWhole() {
+    _named.assign(_map->catalogue().fields().size(), false);
+    for (std::size_t i = _firstOfWhole; i < _observations.size(); ++i)
+        _named[_observations[i].leaf->index] = true;
+    for (const FieldMap::Entry& entry : _map->entries()) {
+        if (entry.list)
+            continue; // goes with the list
+        const CatalogueField& leaf = *entry.node->leaf();
+        if (!_named[leaf.index] && mayBeShown(leaf))
+            _removed.push_back(&leaf);
+        setShown(leaf, _named[leaf.index]);
+    }
+}
+
+void Observer::setShown(const CatalogueField& leaf, bool isShown) {
+    if (leaf.index >= _shown.size())
+        _shown.resize(leaf.index + 1, true);
+    _shown[leaf.index] = isShown;
+}
+
 void Observer::newRow(std::uint32_t number) {
     if (_usedRows == _rows.size())
         _rows.emplace_back();

@@ -45,6 +45,10 @@ public:
     void text(const Field& field, std::string_view text) override;
     void supplied(const Field& field, const Value& value) override;
     void removed(std::string_view label) override;
+    void beginWhole() override;
+    void endWhole() override;
+    /// Observing begins, or goes on after an interruption: any leaf may show something of earlier messages.
+    void assumeAllShown() { _shown.clear(); }
 
     void beginList(const List& list) override;
     void beginRow() override;
@@ -75,6 +79,11 @@ private:
     /// A value of a list without rows begins.
     void beginValue();
     void newRow(std::uint32_t number);
+    /// Whether the leaf may show something; by default it may.
+    [[nodiscard]] bool mayBeShown(const CatalogueField& leaf) const {
+        return leaf.index >= _shown.size() || _shown[leaf.index];
+    }
+    void setShown(const CatalogueField& leaf, bool isShown);
     void leaf(const CatalogueField& leaf, const Value& value);
 
     std::uint64_t _messages = 0;
@@ -84,7 +93,10 @@ private:
     std::vector<Observation> _observations;
     std::vector<ObservedList> _lists;
     std::vector<const CatalogueField*> _removed;
-    std::vector<bool> _displayed; ///< by index in the catalogue, see `display`
+    std::size_t _firstOfWhole = 0; ///< the first observation of a whole account
+    std::vector<bool> _named;      ///< by index in the catalogue, in the whole account
+    std::vector<bool> _shown;      ///< by index in the catalogue, of sections with whole accounts
+    std::vector<bool> _displayed;  ///< by index in the catalogue, see `display`
     std::vector<bool> _displayedBefore;
     std::vector<Level> _levels;
     TextArena _texts;

@@ -3,7 +3,7 @@
 # shellcheck shell=bash
 # Completion of Velmora's programs for bash, by way of bash-completion, which loads it under each one's name.
 
-_velmora_technologies=(IFX Ostrel_GSM Ostrel_CDMA Ostrel_LTE Ostrel_UTRAN2)
+_velmora_technologies=(IFX Ostrel_GSM Ostrel_CDMA Ostrel_LTE Ostrel_UTRAN2 Modem)
 
 _velmora_roles=(serving serving.{mcc,mnc,area,cell,channel,physical-cell,level,quality} neighbour
     neighbour.{channel,physical-cell,level,quality} registration.state radio.state block-error-rate data-rate)
@@ -45,7 +45,7 @@ _velmora_source() {
     local source=$cur head=${cur%,*},
     case $source in
     scenario:*,*) _velmora_offer "${head}seed=" "${head}speed=" ;;
-    scenario:*) _velmora_offer scenario:{gsm,c2k,lte,utran,ifx} ;;
+    scenario:*) _velmora_offer scenario:{gsm,c2k,lte,utran,ifx,modem} ;;
     replay:*,technology=*)
         # What stands before the equals sign is a word of its own to bash.
         cur=${cur##*=}

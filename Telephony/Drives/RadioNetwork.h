@@ -68,6 +68,9 @@ public:
     [[nodiscard]] const std::vector<UMTSMeasurement>& umts() const { return _umts; }
     /// The total power received on the best UMTS cell's carrier.
     [[nodiscard]] double umtsRSSI_dBm() const { return _umtsRSSI_dBm; }
+    /// Where the car is, from the centre of the ring.
+    [[nodiscard]] double east_m() const { return _x_m; }
+    [[nodiscard]] double north_m() const { return _y_m; }
 
 private:
     struct Sector {

@@ -7,6 +7,7 @@
 #include "Telephony/Drives/GSM/GSMScenario.h"
 #include "Telephony/Drives/IFX/IFXScenario.h"
 #include "Telephony/Drives/LTE/LTEScenario.h"
+#include "Telephony/Drives/Modem/ModemScenario.h"
 #include "Telephony/Drives/UTRAN/UTRANScenario.h"
 
 namespace velmora {
@@ -23,6 +24,7 @@ constexpr ScenarioKind kinds[] = {
     {"lte", "a drive through LTE (Ostrel LTE)", make<LTEScenario>},
     {"utran", "a drive through TD-SCDMA (Ostrel UTRAN2)", make<UTRANScenario>},
     {"ifx", "a drive through GSM, as property lists (IFX)", make<IFXScenario>},
+    {"modem", "a live modem through GSM, UMTS, LTE and NR (Modem)", make<ModemScenario>},
 };
 
 } // namespace

@@ -20,7 +20,9 @@ LogLines DecoderFixture::update(const Data& record) {
 }
 
 std::string DecoderFixture::node(std::string_view group, std::string_view section) {
-    return shown((*(*generator->display(state).asDictionary())[group].asDictionary())[section]);
+    const Value display = generator->display(state);
+    const Value& place = group.empty() ? display : (*display.asDictionary())[group];
+    return shown((*place.asDictionary())[section]);
 }
 
 } // namespace velmora

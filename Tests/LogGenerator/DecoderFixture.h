@@ -27,7 +27,7 @@ protected:
     /// Decodes the record; returns the log lines.
     LogLines update(const Data& record);
     [[nodiscard]] std::string display() { return shown(generator->display(state)); }
-    /// A section's node as `shown` returns it.
+    /// A section's node as `shown` returns it; of a section that is in no group, the group is empty.
     [[nodiscard]] std::string node(std::string_view group, std::string_view section);
 
     FakeClock clock;

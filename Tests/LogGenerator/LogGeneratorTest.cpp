@@ -6,6 +6,7 @@
 #include "LogGenerator/C2K/C2KLogGenerator.h"
 #include "LogGenerator/GSM/GSMLogGenerator.h"
 #include "LogGenerator/LTE/LTELogGenerator.h"
+#include "LogGenerator/Modem/ModemLogGenerator.h"
 #include "LogGenerator/OstrelGSM/Ostrel_GSMLogGenerator.h"
 #include "LogGenerator/UTRAN/UTRANLogGenerator.h"
 #include "Platform/TelephonyService.h"
@@ -38,6 +39,7 @@ TEST(TechnologyTest, ConstantSelectsItsDecoderByValue) {
     FakeResources resources;
     resources.put("Ostrel_UTRAN", "plist", Value(makeDictionary())); // chosen by what there is
     EXPECT_TRUE(selects<UTRANLogGenerator>(std::string("kVoxLogChannelTechnology_Ostrel_UTRAN2")));
+    EXPECT_TRUE(selects<ModemLogGenerator>(std::string("kVoxLogChannelTechnology_Modem")));
 }
 
 TEST(TechnologyTest, AnyOtherNameSelectsNoneAndSaysNothing) {

@@ -44,13 +44,16 @@ TEST(LogCodesTest, belongToTheTechnologyOfTheirSections) {
 
 TEST(LogCodesTest, belongToAllTechnologiesWithSectionsInTheExtraStream) {
     for (const std::uint32_t code : {0xFF0000u, 0xFF0001u, 0xFF0002u})
-        EXPECT_THAT(wanting(code), UnorderedElementsAre("Ostrel_GSM", "Ostrel_LTE", "Ostrel_UTRAN2"));
+        EXPECT_THAT(wanting(code),
+                    UnorderedElementsAre("Ostrel_GSM", "Ostrel_LTE", "Ostrel_UTRAN2", "Modem"));
+    for (std::uint32_t code = 0xFF0003; code <= 0xFF0007; ++code)
+        EXPECT_THAT(wanting(code), UnorderedElementsAre("Modem"));
 }
 
 TEST(LogCodesTest, belongToNoneWhereNoDecoderWantsThem) {
     EXPECT_THAT(wanting(0x108A), UnorderedElementsAre("Ostrel_CDMA")); // the lowest code
     for (const std::uint32_t code :
-         {0u, 1u, 0x1089u, 0x108Bu, 0x1375u, 0xFFFFu, 0x10000u, 0x1005137u, 0xFF0003u})
+         {0u, 1u, 0x1089u, 0x108Bu, 0x1375u, 0xFFFFu, 0x10000u, 0x1005137u, 0xFF0008u})
         EXPECT_THAT(wanting(code), IsEmpty()) << code;
 }
 

@@ -77,8 +77,35 @@ constexpr ExampleRecording::Excerpt ifx[] = {
     {140, 152}, // and ends; search again
 };
 
+constexpr ExampleRecording::Excerpt modem[] = {
+    {0, 18},    // no manager, no permission, no modem; a locked SIM; GSM
+    {29, 31},   // a property list that is cut off
+    {38, 41},   // a packet session
+    {59.5, 61}, // values that cannot be
+    {63, 66},   // UMTS, first without its measurement
+    {68, 69},   //
+    {89, 90},   // LTE
+    {94, 96},   // a second context
+    {114, 119}, // another carrier
+    {129, 131}, // 5G non-standalone
+    {155, 159}, // 5G standalone, a new connection
+    {180, 182}, // another carrier
+    {196, 199}, // no coverage
+    {202, 203}, // its contexts are gone
+    {208, 210}, // limited service
+    {218, 225}, // the other SIM
+    {228, 230}, // a connection after one that failed
+    {238, 240}, // unplugged
+    {244, 246}, // the return, without a SIM
+    {249, 254}, // with it, without permission
+    {257, 258}, //
+    {261, 262}, // no answer
+    {393, 398}, // 5G non-standalone in the next round
+};
+
 constexpr ExampleRecording recordings[] = {
-    {"gsm", 1, gsm}, {"c2k", 1, c2k}, {"lte", 1, lte}, {"utran", 1, utran}, {"ifx", 1, ifx},
+    {"gsm", 1, gsm},     {"c2k", 1, c2k}, {"lte", 1, lte},
+    {"utran", 1, utran}, {"ifx", 1, ifx}, {"modem", 1, modem},
 };
 
 } // namespace

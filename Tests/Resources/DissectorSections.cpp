@@ -19,10 +19,9 @@ namespace velmora {
 namespace {
 
 constexpr std::string_view technologies[] = {
-    kVoxLogChannelTechnology_Ostrel_GSM,
-    kVoxLogChannelTechnology_Ostrel_LTE,
-    kVoxLogChannelTechnology_Ostrel_UTRAN2,
-    kVoxLogChannelTechnology_Ostrel_CDMA,
+    kVoxLogChannelTechnology_Ostrel_GSM,    kVoxLogChannelTechnology_Ostrel_LTE,
+    kVoxLogChannelTechnology_Ostrel_UTRAN2, kVoxLogChannelTechnology_Ostrel_CDMA,
+    kVoxLogChannelTechnology_Modem,
 };
 
 const FakeClock clock;

@@ -103,7 +103,7 @@ TEST(SourceStringTest, saysWhatIsWrong) {
     const std::string scenarios = ", wanted one of: " + scenarioNames();
     const std::string seeds = ", wanted a whole number from 0 to 18446744073709551615";
     const std::string technologies =
-        ", wanted one of: IFX, Ostrel_GSM, Ostrel_CDMA, Ostrel_LTE, Ostrel_UTRAN2";
+        ", wanted one of: IFX, Ostrel_GSM, Ostrel_CDMA, Ostrel_LTE, Ostrel_UTRAN2, Modem";
     const std::string files = ", wanted the name of a file, which is read anew for each client";
     for (const Case& each : {
              Case{"", "source is \"\"" + kinds},
@@ -161,7 +161,7 @@ TEST(ScenarioRegistryTest, scenariosHaveNamesOfTheirOwnAndAKnownTechnology) {
                     ::testing::AnyOf(kVoxLogChannelTechnology_IFX, kVoxLogChannelTechnology_Ostrel_GSM,
                                      kVoxLogChannelTechnology_Ostrel_CDMA,
                                      kVoxLogChannelTechnology_Ostrel_LTE,
-                                     kVoxLogChannelTechnology_Ostrel_UTRAN2));
+                                     kVoxLogChannelTechnology_Ostrel_UTRAN2, kVoxLogChannelTechnology_Modem));
     }
     EXPECT_TRUE(names.contains("gsm"));
     EXPECT_EQ(scenarioKindNamed("GSM"), nullptr);

@@ -16,7 +16,7 @@ using testing::ElementsAre;
 using testing::HasSubstr;
 
 const std::string technologies =
-    "IFX, GSM (Ostrel_GSM), CDMA (Ostrel_CDMA), LTE (Ostrel_LTE), UTRAN (Ostrel_UTRAN2)";
+    "IFX, GSM (Ostrel_GSM), CDMA (Ostrel_CDMA), LTE (Ostrel_LTE), UTRAN (Ostrel_UTRAN2), Modem";
 
 TEST(CommandLineErrorsTest, UsageErrorsGiveTheFoundAndTheExpectedValue) {
     struct Case {

@@ -179,6 +179,7 @@ TEST(CommandLineTest, TechnologiesHaveShortFormsInAnyCase) {
         {"UTRAN", "Ostrel_UTRAN2"},
         {"cdma", "Ostrel_CDMA"},
         {"ifx", "IFX"},
+        {"modem", "Modem"},
         {"ostrel_utran2", "Ostrel_UTRAN2"},
         {"KVOXLOGCHANNELTECHNOLOGY_OSTREL_LTE", "Ostrel_LTE"},
         // These are taken as they are.

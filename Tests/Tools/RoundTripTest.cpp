@@ -191,7 +191,8 @@ TEST_P(RoundTripTest, DLFLogHasTheRecords) {
     EXPECT_EQ(decoded("drive.dlf"), decoded("drive.pcapng"));
 }
 
-INSTANTIATE_TEST_SUITE_P(EachTechnology, RoundTripTest, testing::Values("gsm", "lte", "utran", "c2k", "ifx"),
+INSTANTIATE_TEST_SUITE_P(EachTechnology, RoundTripTest,
+                         testing::Values("gsm", "lte", "utran", "c2k", "ifx", "modem"),
                          [](const auto& tested) { return std::string(tested.param); });
 
 } // namespace

@@ -5,6 +5,7 @@
 
 #include "LogGenerator/C2K/LogCodeParsers.h"
 #include "LogGenerator/LTE/LTEClassIndex.h"
+#include "LogGenerator/Modem/ModemClassIndex.h"
 #include "LogGenerator/OstrelGSM/Ostrel_GSMClassIndex.h"
 #include "LogGenerator/UTRAN/UTRANClassIndex.h"
 #include "Platform/TelephonyService.h"
@@ -46,6 +47,7 @@ std::vector<TechnologyTable> technologyTables() {
         tableOfRecords(kVoxLogChannelTechnology_Ostrel_CDMA),
         tableOfSections<LTEClassIndex>(kVoxLogChannelTechnology_Ostrel_LTE),
         tableOfSections<UTRANClassIndex>(kVoxLogChannelTechnology_Ostrel_UTRAN2),
+        tableOfSections<ModemClassIndex>(kVoxLogChannelTechnology_Modem),
     };
 }
 

@@ -61,6 +61,7 @@ public:
     [[nodiscard]] const std::vector<LTEMeasurement>& cells(std::size_t carrier) const {
         return _cells.at(carrier);
     }
+    [[nodiscard]] const RadioNetwork& radio() const { return _network; }
     [[nodiscard]] const std::vector<GSMMeasurement>& gsm() const { return _network.gsm(); }
     [[nodiscard]] const std::vector<UMTSMeasurement>& umts() const { return _network.umts(); }
 

@@ -58,6 +58,42 @@ TEST(DisplayWriterTest, WritesUnderLabelsAndKeepsTheirOrder) {
     EXPECT_EQ(shown(node), "{B '3', Level '-0.2 dB', A '1'}");
 }
 
+TEST(DisplayWriterTest, AWholeAccountReplacesWhatThereWasInItsOwnOrder) {
+    constexpr List list{"List", List::Entries::Values, ""};
+    const DictionaryRef node = makeDictionary();
+    DisplayWriter::SpareRows spare;
+    const auto write = [&](std::string_view letters) {
+        DisplayWriter writer(*node, spare);
+        writer.beginWhole();
+        for (const char letter : letters) {
+            if (letter == 'l') {
+                writer.beginList(list);
+                writer.number(value, 7);
+                writer.endList();
+            } else {
+                writer.number(letter == 'a' ? a : b, letter);
+            }
+        }
+        writer.endWhole();
+        return shown(node);
+    };
+    EXPECT_EQ(write("b"), "{B '98'}");
+    EXPECT_EQ(write("alb"), "{A '97', List ['7'], B '98'}"); // B, which was there first, is last
+    EXPECT_EQ(write("lb"), "{List ['7'], B '98'}");
+    EXPECT_EQ(write("ab"), "{A '97', B '98'}");
+    EXPECT_EQ(write(""), "{}");
+}
+
+TEST(DisplayWriterTest, AWholeAccountLeavesANodeOfTheOtherKindAlone) {
+    ListWriting list;
+    list.write({"a"});
+    DisplayWriter writer(*list.node, list.spare);
+    writer.beginWhole();
+    writer.number(a, 1);
+    writer.endWhole();
+    EXPECT_EQ(shown(list.node), "[{A '97'}]");
+}
+
 TEST(DisplayWriterTest, SuppliedValuesStandAsTheyAre) {
     const DictionaryRef node = makeDictionary();
     const ArrayRef list = makeArray();

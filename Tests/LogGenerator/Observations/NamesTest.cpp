@@ -38,6 +38,10 @@ TEST(UnitTest, HasTheNameThatFollowsANumber) {
     EXPECT_EQ(nameOf(Unit::Percent), "%");
     EXPECT_EQ(nameOf(Unit::KilobitPerSecond), "kbit/s");
     EXPECT_EQ(nameOf(Unit::Second), "s");
+    EXPECT_EQ(nameOf(Unit::Megahertz), "MHz");
+    EXPECT_EQ(nameOf(Unit::Byte), "byte");
+    EXPECT_EQ(nameOf(Unit::Degree), "\u00B0");
+    EXPECT_EQ(nameOf(Unit::Metre), "m");
 }
 
 struct SuffixCase {
@@ -57,10 +61,20 @@ TEST_P(SuffixTest, HasItsUnit) {
 }
 
 constexpr SuffixCase suffixes[] = {
-    {"None", "", Unit::None, 1},          {"Level", " dBm", Unit::DBm, 1},
-    {"Ratio", " dB", Unit::DB, 1},        {"Share", "%", Unit::Percent, 1},
-    {"Old", "% (old)", Unit::Percent, 1}, {"Rate", " kbps", Unit::KilobitPerSecond, 1.024},
-    {"Time", " sec", Unit::Second, 1},    {"Pilot", " \u00D7 64chips", Unit::None, 1},
+    {"None", "", Unit::None, 1},
+    {"Level", " dBm", Unit::DBm, 1},
+    {"Ratio", " dB", Unit::DB, 1},
+    {"Share", "%", Unit::Percent, 1},
+    {"Old", "% (old)", Unit::Percent, 1},
+    {"Rate", " kbps", Unit::KilobitPerSecond, 1.024},
+    {"Time", " sec", Unit::Second, 1},
+    {"Pilot", " \u00D7 64chips", Unit::None, 1},
+    {"PlainRate", " kbit/s", Unit::KilobitPerSecond, 1},
+    {"Duration", " s", Unit::Second, 1},
+    {"Frequency", " MHz", Unit::Megahertz, 1},
+    {"Size", " bytes", Unit::Byte, 1},
+    {"Angle", "\u00B0", Unit::Degree, 1},
+    {"Length", " m", Unit::Metre, 1},
 };
 INSTANTIATE_TEST_SUITE_P(Suffixes, SuffixTest, testing::ValuesIn(suffixes),
                          [](const auto& tested) { return tested.param.name; });
@@ -68,7 +82,7 @@ INSTANTIATE_TEST_SUITE_P(Suffixes, SuffixTest, testing::ValuesIn(suffixes),
 TEST(UnitTest, AnotherSuffixHasNone) {
     EXPECT_FALSE(unitOfSuffix("dBm"));
     EXPECT_FALSE(unitOfSuffix(" dBm "));
-    EXPECT_FALSE(unitOfSuffix(" MHz"));
+    EXPECT_FALSE(unitOfSuffix(" GHz"));
 }
 
 TEST(IdentityTest, HasItsName) {

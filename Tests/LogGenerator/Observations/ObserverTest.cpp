@@ -11,6 +11,7 @@ namespace {
 
 using testing::ElementsAre;
 using testing::IsEmpty;
+using testing::UnorderedElementsAre;
 
 constexpr Field first{"First", u8At(0), integer("%d")};
 constexpr Field second{"Second", u8At(1), integer("%d dB")};
@@ -183,6 +184,49 @@ TEST_F(ObserverTest, ALabelThatIsRemovedIsReported) {
     EXPECT_THAT(observer.message(Time(), std::nullopt, std::nullopt).removed,
                 ElementsAre(&leaf("/Section/Second")));
     EXPECT_THAT(observations(), IsEmpty());
+}
+
+class WholeAccountTest : public ObserverTest {
+protected:
+    WholeAccountTest() { describe(contents); }
+
+    /// What a message with these fields and a list of that many rows reports as removed.
+    std::vector<std::string> account(const std::vector<const Field*>& fields, int listed) {
+        observer.beginMessage();
+        EXPECT_TRUE(observer.beginSection(map, code));
+        observer.beginWhole();
+        for (const Field* const field : fields)
+            observer.number(*field, 1);
+        observer.beginList(cells);
+        for (int i = 0; i < listed; ++i) {
+            observer.beginRow();
+            observer.number(rows[0], 1);
+            observer.endRow();
+        }
+        observer.endList();
+        observer.endWhole();
+        return removed();
+    }
+
+    const Content contents[3] = {first, second, cells};
+};
+
+TEST_F(WholeAccountTest, WhatItDoesNotNameIsGoneOnce) {
+    // There may be values from before the first message.
+    EXPECT_THAT(account({&first}, 2), ElementsAre("/Section/Second"));
+    EXPECT_THAT(account({&first, &second}, 0), IsEmpty()); // the rows are the list's
+    EXPECT_THAT(account({}, 1), UnorderedElementsAre("/Section/First", "/Section/Second"));
+    EXPECT_THAT(account({}, 1), IsEmpty());
+    EXPECT_THAT(account({&second}, 1), IsEmpty());
+    EXPECT_THAT(account({&first}, 1), ElementsAre("/Section/Second"));
+}
+
+TEST_F(WholeAccountTest, AfterAnInterruptionAnythingMayHaveBeenShown) {
+    account({&first, &second}, 0);
+    account({}, 0);
+    EXPECT_THAT(account({}, 0), IsEmpty());
+    observer.assumeAllShown();
+    EXPECT_THAT(account({}, 0), UnorderedElementsAre("/Section/First", "/Section/Second"));
 }
 
 TEST_F(ObserverTest, AMessageForgetsTheOneBefore) {

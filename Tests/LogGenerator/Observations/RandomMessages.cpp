@@ -55,6 +55,8 @@ RandomMessages::RandomMessages(const LogGenerator& decoder, std::vector<Data> dr
         for (const Value& code : *codes)
             _codes.push_back(static_cast<std::uint16_t>(*code.asInteger()));
     _hasService = command->contains("SetVoxExtraCodes");
+    if (decoder.technology() == kVoxLogChannelTechnology_Modem)
+        _ofModem.emplace(seed);
 }
 
 std::int64_t RandomMessages::between(std::int64_t least, std::int64_t most) {
@@ -70,6 +72,8 @@ std::uint8_t RandomMessages::byte() {
 }
 
 Data RandomMessages::next() {
+    if (_ofModem)
+        return between(0, 2) == 0 ? changedMessage() : _ofModem->next();
     if (_codes.empty())
         return Data(*writeBinaryPropertyList(tree(3)));
     const std::int64_t choice = between(0, 9);

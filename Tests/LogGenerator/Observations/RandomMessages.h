@@ -5,8 +5,10 @@
 
 #include "LogGenerator/LogGenerator.h"
 #include "Platform/Bytes.h"
+#include "Tests/LogGenerator/Observations/RandomModemMessages.h"
 
 #include <cstdint>
+#include <optional>
 #include <random>
 #include <vector>
 
@@ -14,7 +16,7 @@ namespace velmora {
 
 /// Messages that no modem would send, of the log codes that a decoder asks for: random contents and lengths,
 /// a drive's messages with some bytes changed, and the telephony service's lists with random values; of a
-/// decoder that asks for no codes, random trees of texts.
+/// decoder that asks for no codes, random trees of texts; of a live modem's, those of RandomModemMessages.
 class RandomMessages {
 public:
     RandomMessages(const LogGenerator& decoder, std::vector<Data> drive, std::uint64_t seed);
@@ -37,6 +39,7 @@ private:
     std::vector<Data> _drive;
     std::vector<std::uint16_t> _codes;
     bool _hasService = false;
+    std::optional<RandomModemMessages> _ofModem;
     int _contents = 0; ///< how the bytes of this record are chosen
 };
 

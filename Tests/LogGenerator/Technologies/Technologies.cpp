@@ -36,7 +36,8 @@ void PrintTo(const Technology& technology, std::ostream* out) {
 }
 
 const std::vector<Technology>& technologies() {
-    static const std::vector<Technology> all = {expectedLTE(), expectedOstrelGSM(), expectedUTRAN()};
+    static const std::vector<Technology> all = {expectedLTE(), expectedModem(), expectedOstrelGSM(),
+                                                expectedUTRAN()};
     return all;
 }
 

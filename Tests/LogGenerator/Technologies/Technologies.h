@@ -7,6 +7,7 @@
 #include "LogGenerator/LogGenerator.h"
 #include "Platform/Bytes.h"
 #include "Tests/Support/CapturedLog.h"
+#include "Tests/Support/Hex.h"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
@@ -72,8 +73,8 @@ struct DecoderExpectation {
     CapturedLog::Line firstLine;          ///< when it is made
     std::vector<const char*> destruction; ///< the names whose destruction it logs
 
-    Data record; ///< one of a section, and what it shows
-    const char* group;
+    Data record;       ///< one of a section, and what it shows
+    const char* group; ///< empty for a section that is in none
     const char* section;
     const char* node;
 };
@@ -95,6 +96,8 @@ struct Technology {
     Data full;                ///< a record that holds all that any of the sections reads
     Data cells;               ///< a cell information array that each section finds a cell in
     LineCounts fullLines;     ///< of these two
+    Data emptyCells = extraRecord(1, makeArray());    ///< without a cell
+    Data emptyContexts = extraRecord(2, makeArray()); ///< without a context
 
     DecoderExpectation decoder;
 
@@ -109,6 +112,7 @@ void PrintTo(const Technology& technology, std::ostream* out);
 
 /// One technology each.
 [[nodiscard]] Technology expectedLTE();
+[[nodiscard]] Technology expectedModem();
 [[nodiscard]] Technology expectedOstrelGSM();
 [[nodiscard]] Technology expectedUTRAN();
 /// All of them.

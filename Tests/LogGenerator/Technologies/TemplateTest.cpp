@@ -102,7 +102,7 @@ TEST_P(TemplateKeysTest, ArePathComponents) {
 }
 
 INSTANTIATE_TEST_SUITE_P(All, TemplateKeysTest,
-                         testing::Values("LTE", "Ostrel_GSM", "Ostrel_UTRAN", "C2KTemplate"),
+                         testing::Values("LTE", "Modem", "Ostrel_GSM", "Ostrel_UTRAN", "C2KTemplate"),
                          [](const auto& name) { return std::string(name.param); });
 
 } // namespace

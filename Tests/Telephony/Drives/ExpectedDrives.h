@@ -55,5 +55,6 @@ inline void PrintTo(const ExpectedDrive& drive, std::ostream* out) {
 [[nodiscard]] ExpectedDrive expectedC2KDrive();
 [[nodiscard]] ExpectedDrive expectedLTEDrive();
 [[nodiscard]] ExpectedDrive expectedUTRANDrive();
+[[nodiscard]] ExpectedDrive expectedModemDrive();
 
 } // namespace velmora

@@ -51,7 +51,8 @@ INSTANTIATE_TEST_SUITE_P(Drives, ScenarioTest,
                                          Spoken{"c2k", kVoxLogChannelTechnology_Ostrel_CDMA},
                                          Spoken{"lte", kVoxLogChannelTechnology_Ostrel_LTE},
                                          Spoken{"utran", kVoxLogChannelTechnology_Ostrel_UTRAN2},
-                                         Spoken{"ifx", kVoxLogChannelTechnology_IFX}),
+                                         Spoken{"ifx", kVoxLogChannelTechnology_IFX},
+                                         Spoken{"modem", kVoxLogChannelTechnology_Modem}),
                          [](const auto& scenario) { return std::string(scenario.param.name); });
 
 /// The scenarios whose messages are log records.
@@ -121,7 +122,7 @@ TEST_P(RecordScenarioTest, timeAscendsAndStampsFollowIt) {
 
 INSTANTIATE_TEST_SUITE_P(Drives, RecordScenarioTest,
                          testing::Values(expectedGSMDrive(), expectedC2KDrive(), expectedLTEDrive(),
-                                         expectedUTRANDrive()),
+                                         expectedUTRANDrive(), expectedModemDrive()),
                          scenarioName);
 
 /// Those of them whose records have tables of requirements, and that send the extra stream.

@@ -232,7 +232,7 @@ TEST_F(ConvertCommandTest, TechnologyIsTheUsersBeforeTheFiles) {
         EXPECT_EQ(convert({path("none.pcapng"), path("out/none" + form)}, 1),
                   "velmora-log: " + path("none.pcapng") +
                       ": names no technology, wanted one of IFX, Ostrel_GSM, Ostrel_CDMA, Ostrel_LTE, "
-                      "Ostrel_UTRAN2; --technology supplies it\n")
+                      "Ostrel_UTRAN2, Modem; --technology supplies it\n")
             << form;
         EXPECT_THAT(outputs(), ElementsAre()) << form;
     }

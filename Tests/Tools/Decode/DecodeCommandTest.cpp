@@ -147,7 +147,8 @@ TEST_F(DecodeCommandTest, TechnologyOptionOverridesTheFile) {
 }
 
 TEST_F(DecodeCommandTest, UnknownOrMissingTechnologyIsReportedWithTheValidOnes) {
-    constexpr const char* names = "wanted one of IFX, Ostrel_GSM, Ostrel_CDMA, Ostrel_LTE, Ostrel_UTRAN2";
+    constexpr const char* names =
+        "wanted one of IFX, Ostrel_GSM, Ostrel_CDMA, Ostrel_LTE, Ostrel_UTRAN2, Modem";
     writeRecording("none.pcapng", "", {{at(0), rrState(5)}});
     writeRecording("other.pcapng", "Nonesuch", {{at(0), rrState(5)}});
     struct Case {

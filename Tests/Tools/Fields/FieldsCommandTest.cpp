@@ -67,8 +67,8 @@ TEST_F(FieldsCommandTest, JSONHasAllTechnologiesInTheServicesOrder) {
             technologies.push_back(technology);
         EXPECT_TRUE(paths.insert(technology + row.at("path").get<std::string>()).second) << row;
     }
-    EXPECT_THAT(technologies,
-                testing::ElementsAre("IFX", "Ostrel_GSM", "Ostrel_CDMA", "Ostrel_LTE", "Ostrel_UTRAN2"));
+    EXPECT_THAT(technologies, testing::ElementsAre("IFX", "Ostrel_GSM", "Ostrel_CDMA", "Ostrel_LTE",
+                                                   "Ostrel_UTRAN2", "Modem"));
 }
 
 TEST_F(FieldsCommandTest, CSVHasTheSameRowsAsJSON) {

@@ -194,7 +194,7 @@ TEST_F(RecordCommandTest, TechnologyWithoutADecoderIsReported) {
     EXPECT_EQ(ownMessages(process.errors()),
               "velmora-log: the telephony service speaks Nonesuch, which has no decoder "
               "here, wanted one of IFX, Ostrel_GSM, Ostrel_CDMA, Ostrel_LTE, "
-              "Ostrel_UTRAN2\n");
+              "Ostrel_UTRAN2, Modem\n");
     EXPECT_FALSE(exists("drive.pcapng"));
 }
 

@@ -130,7 +130,8 @@ TEST_F(WatchCommandTest, ATechnologyWithoutADecoderIsReported) {
     ToolProcess process(tool({"watch"}));
     EXPECT_TRUE(process.waitForError(
         "velmora-log: the telephony service's technology Ostrel_NR has no decoder here, wanted one of IFX, "
-        "Ostrel_GSM, Ostrel_CDMA, Ostrel_LTE, Ostrel_UTRAN2; start the service with another source\n"));
+        "Ostrel_GSM, Ostrel_CDMA, Ostrel_LTE, Ostrel_UTRAN2, Modem; start the service with another "
+        "source\n"));
     process.signal(SIGINT);
     EXPECT_EQ(process.exitStatus(), 0);
 }

@@ -97,6 +97,38 @@ TEST_F(LongSamplesTest, ServingLevelOfGSMIsNegative) {
     }
 }
 
+// Each message is the whole account, so that there are as many values as messages that have one.
+TEST_F(LongSamplesTest, ValuesOfALiveModemAreThoseOfItsPropertyLists) {
+    struct Compared {
+        const char* path;
+        const char* unit;
+        std::vector<std::string> from; ///< where record-values.py finds the values
+    };
+    const Compared all[] = {
+        {"/Serving Cell/RSRP", "dBm", {"0xFF0001:list", "kVoxCellMonitorCells", "0", "kVoxCellMonitorRSRP"}},
+        {"/Serving Cell/SINR", "dB", {"0xFF0001:list", "kVoxCellMonitorCells", "0", "kVoxCellMonitorSINR"}},
+        {"/Serving Cell/EARFCN", "", {"0xFF0001:list", "kVoxCellMonitorCells", "0", "kVoxCellMonitorEARFCN"}},
+        {"/Position/Latitude", "\u00B0", {"0xFF0007:list", "kVoxPositionLatitude"}},
+    };
+    for (const Compared& compared : all) {
+        SCOPED_TRACE(compared.path);
+        std::vector<std::string> arguments = compared.from;
+        arguments.insert(arguments.begin(), recording("modem"));
+        const std::vector<std::string> expected = recordValues(arguments);
+        const std::vector<std::string> found =
+            lines(samplesOfRecording({"--format", "jsonl", "--select", compared.path, recording("modem")}));
+        ASSERT_GT(expected.size(), 5U);
+        ASSERT_EQ(found.size(), expected.size());
+        for (std::size_t i = 0; i < found.size(); ++i) {
+            const Json sample = Json::parse(found[i]);
+            const std::size_t blank = expected[i].find(' ');
+            EXPECT_EQ(std::to_string(sample["record"].get<int>()), expected[i].substr(0, blank));
+            EXPECT_DOUBLE_EQ(sample["value"].get<double>(), std::stod(expected[i].substr(blank)));
+            EXPECT_EQ(sample.value("unit", ""), compared.unit);
+        }
+    }
+}
+
 // In an entry of 14 bytes from 29 on, the channel is at 0 and the level's amount at 2.
 TEST_F(LongSamplesTest, ARowOfAListHasItsKey) {
     std::vector<std::string> shown;

@@ -5,6 +5,8 @@
 
 record-values.py RECORDING CODE[:any] [OFFSET]: for each record of the baseband's stream, or of any type, with that
 code, the message's number, and the byte at the offset as a number where one is given.
+record-values.py RECORDING CODE:list KEY...: for each record of the extra stream with that code whose property list has a
+value along the keys, numbers of which count the elements of an array: the message's number and the value.
 record-values.py RECORDING KEY KEY: for each property list with the second key in the dictionary of the first, the
 message's number and the value.
 """
@@ -19,6 +21,7 @@ ENHANCED_PACKET_BLOCK = 6
 HEADER_LENGTH = 13
 PREFIX_MARKER = 0x81
 BASEBAND = 1
+EXTRA = 0xFF
 
 
 def little(data: bytes, offset: int, length: int) -> int:
@@ -46,6 +49,30 @@ def print_records(packets: list[bytes], code: int, any_type: bool, offset: int |
             print(number if offset is None else f"{number} {record[offset]}")
 
 
+def value_along(keys: list[str], value: object) -> object:
+    for key in keys:
+        if isinstance(value, dict):
+            value = value.get(key)
+        elif isinstance(value, list) and key.isdigit() and int(key) < len(value):
+            value = value[int(key)]
+        else:
+            return None
+    return value
+
+
+def print_list_values(packets: list[bytes], code: int, keys: list[str]) -> None:
+    for number, message in enumerate(packets, 1):
+        record = message[2:] if message[:1] == bytes([PREFIX_MARKER]) else message
+        if len(record) < HEADER_LENGTH or record[0] != EXTRA or little(record, 3, 2) != code & 0xFFFF:
+            continue
+        try:
+            value = value_along(keys, plistlib.loads(record[HEADER_LENGTH:]))
+        except plistlib.InvalidFileException:
+            continue  # cut off, on purpose
+        if value is not None:
+            print(number, value)
+
+
 def print_properties(packets: list[bytes], group: str, key: str) -> None:
     for number, message in enumerate(packets, 1):
         value = plistlib.loads(message).get(group, {}).get(key)
@@ -57,6 +84,9 @@ def main(name: str, what: str, *rest: str) -> None:
     packets = messages(Path(name).read_bytes())
     if what.startswith("0x"):
         code, _, types = what.partition(":")
+        if types == "list":
+            print_list_values(packets, int(code, 16), list(rest))
+            return
         print_records(packets, int(code, 16), types == "any", int(rest[0]) if rest else None)
     else:
         print_properties(packets, what, rest[0])
