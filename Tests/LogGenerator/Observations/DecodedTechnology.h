@@ -27,7 +27,8 @@ struct DecodedTechnology {
 };
 
 inline constexpr DecodedTechnology decodedTechnologies[] = {
-    {"gsm", "Ostrel_GSM"}, {"lte", "LTE"}, {"utran", "Ostrel_UTRAN"}, {"c2k", "C2KTemplate"}, {"ifx", ""}};
+    {"gsm", "Ostrel_GSM"},  {"lte", "LTE"}, {"utran", "Ostrel_UTRAN"},
+    {"c2k", "C2KTemplate"}, {"ifx", ""},    {"modem", "Modem"}};
 
 /// Its decoder with the template that is shipped, and a state.
 class TechnologyUnderTest {
