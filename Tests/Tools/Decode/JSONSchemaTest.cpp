@@ -57,6 +57,7 @@ std::string_view partOf(const ScenarioKind& kind) {
         {"lte", "/Idle Mode Neighbors/Neighbor Cells List/*/Measured RSRP"},
         {"utran", "/Neighbors/Neighbor Cell List/0"},
         {"c2k", "/EV-DO"},
+        {"modem", "/Neighbor Cells/Cells/0"},
         {"ifx", "/Neighbor Cells/1"}};
     for (const auto& [name, path] : parts)
         if (name == kind.name)
@@ -113,9 +114,9 @@ TEST_F(JSONSchemaTest, FileOfAllTechnologiesKeepsToTheSchema) {
         all += contentOf(std::string(kind.name) + ".pcapng"); // a section each
     }
     std::ofstream(path("all.pcapng"), std::ios::binary) << all;
-    const std::string messages = std::to_string(5 * 50 + 4 * 4) + "\n";
+    const std::string messages = std::to_string(6 * 50 + 5 * 4) + "\n";
     for (const auto& [arguments, objects] :
-         {std::pair<std::vector<std::string>, std::string>{{"--format", "json"}, "5\n"},
+         {std::pair<std::vector<std::string>, std::string>{{"--format", "json"}, "6\n"},
           {{"--format", "jsonl", "--every", "message"}, messages},
           {{"--format", "jsonl", "--from", "+1"}, ""},
           {{"--format", "jsonl", "--samples", "--to", "+2"}, ""}}) {
@@ -131,11 +132,11 @@ TEST_F(JSONSchemaTest, FileOfAllTechnologiesKeepsToTheSchema) {
     }
 }
 
-TEST_F(JSONSchemaTest, TechnologiesAreFive) {
-    EXPECT_EQ(scenarioKinds().size(), 5U); // as many as are tested above
+TEST_F(JSONSchemaTest, TechnologiesAreSix) {
+    EXPECT_EQ(scenarioKinds().size(), 6U); // as many as are tested above
 }
 
-INSTANTIATE_TEST_SUITE_P(, TechnologyJSONTest, testing::Range(std::size_t{0}, std::size_t{5}),
+INSTANTIATE_TEST_SUITE_P(, TechnologyJSONTest, testing::Range(std::size_t{0}, std::size_t{6}),
                          [](const auto& place) { return std::string(scenarioKinds()[place.param].name); });
 
 TEST_F(JSONSchemaTest, CheckerFindsWhatIsWrong) {
