@@ -25,9 +25,10 @@ inline constexpr FuzzedTechnology fuzzedTechnologies[] = {
     {"kVoxLogChannelTechnology_Ostrel_LTE", "LTE", "lte"},
     {"kVoxLogChannelTechnology_Ostrel_UTRAN2", "Ostrel_UTRAN", "utran"},
     {"kVoxLogChannelTechnology_Ostrel_CDMA", "C2KTemplate", "c2k"},
+    {"kVoxLogChannelTechnology_Modem", "Modem", "modem"},
     {"kVoxLogChannelTechnology_IFX", "", "ifx"},
 };
-inline constexpr std::size_t binaryTechnologies = 4; ///< the first of them
+inline constexpr std::size_t binaryTechnologies = 5; ///< the first of them
 
 /// The templates that are shipped, as the process's resources for as long as this lives.
 class ShippedTemplates {

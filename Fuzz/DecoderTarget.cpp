@@ -82,8 +82,12 @@ std::unique_ptr<FuzzTarget> makeC2KTarget() {
     return std::make_unique<DecoderTarget>(fuzzedTechnologies[3]);
 }
 
-std::unique_ptr<FuzzTarget> makeIFXTarget() {
+std::unique_ptr<FuzzTarget> makeModemTarget() {
     return std::make_unique<DecoderTarget>(fuzzedTechnologies[4]);
+}
+
+std::unique_ptr<FuzzTarget> makeIFXTarget() {
+    return std::make_unique<DecoderTarget>(fuzzedTechnologies[5]);
 }
 
 } // namespace velmora

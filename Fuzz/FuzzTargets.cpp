@@ -15,6 +15,7 @@ constexpr FuzzTargetKind kinds[] = {
     {"lte", makeLTETarget, [] { return decoderCorpus("lte"); }},
     {"utran", makeUTRANTarget, [] { return decoderCorpus("utran"); }},
     {"c2k", makeC2KTarget, [] { return decoderCorpus("c2k"); }},
+    {"modem", makeModemTarget, [] { return decoderCorpus("modem"); }, 4096},
     {"ifx", makeIFXTarget, [] { return decoderCorpus("ifx"); }, 2048},
     {"same-labels", makeSameLabelsTarget, sameLabelsCorpus, 2048},
     {"observations", makeObservationsTarget, sameLabelsCorpus, 2048},

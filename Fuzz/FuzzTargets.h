@@ -37,6 +37,7 @@ struct FuzzTargetKind {
 [[nodiscard]] std::unique_ptr<FuzzTarget> makeLTETarget();
 [[nodiscard]] std::unique_ptr<FuzzTarget> makeUTRANTarget();
 [[nodiscard]] std::unique_ptr<FuzzTarget> makeC2KTarget();
+[[nodiscard]] std::unique_ptr<FuzzTarget> makeModemTarget();
 [[nodiscard]] std::unique_ptr<FuzzTarget> makeIFXTarget();
 [[nodiscard]] std::unique_ptr<FuzzTarget> makeSameLabelsTarget();
 [[nodiscard]] std::unique_ptr<FuzzTarget> makeObservationsTarget();

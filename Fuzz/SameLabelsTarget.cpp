@@ -102,7 +102,7 @@ private:
     std::array<DecoderMaker, std::size(fuzzedTechnologies)> _makers{
         DecoderMaker(fuzzedTechnologies[0]), DecoderMaker(fuzzedTechnologies[1]),
         DecoderMaker(fuzzedTechnologies[2]), DecoderMaker(fuzzedTechnologies[3]),
-        DecoderMaker(fuzzedTechnologies[4])};
+        DecoderMaker(fuzzedTechnologies[4]), DecoderMaker(fuzzedTechnologies[5])};
 };
 
 } // namespace

@@ -57,8 +57,8 @@ std::string_view partOf(const ScenarioKind& kind) {
         {"lte", "/Idle Mode Neighbors/Neighbor Cells List/*/Measured RSRP"},
         {"utran", "/Neighbors/Neighbor Cell List/0"},
         {"c2k", "/EV-DO"},
-        {"ifx", "/Neighbor Cells/1"},
-        {"modem", "/Serving Cell"}};
+        {"modem", "/Neighbor Cells/Cells/0"},
+        {"ifx", "/Neighbor Cells/1"}};
     for (const auto& [name, path] : parts)
         if (name == kind.name)
             return path;
