@@ -4,8 +4,8 @@
 #include "Telephony/ModemManager/ModemFollower.h"
 
 #include "Platform/SystemLog.h"
-#include "Telephony/ModemManager/BusValue.h"
-#include "Telephony/ModemManager/ModemManagerNames.h"
+#include "Telephony/ModemManager/Bus/BusValue.h"
+#include "Telephony/ModemManager/Bus/ModemManagerNames.h"
 
 #include <utility>
 

@@ -4,8 +4,8 @@
 #pragma once
 
 #include "Platform/MainQueue.h"
+#include "Telephony/ModemManager/Bus/ModemManagerBus.h"
 #include "Telephony/ModemManager/FaultLog.h"
-#include "Telephony/ModemManager/ModemManagerBus.h"
 #include "Telephony/ModemManager/ModemObjects.h"
 
 #include <cstdint>

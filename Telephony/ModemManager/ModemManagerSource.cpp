@@ -6,7 +6,7 @@
 #include "Platform/SystemLog.h"
 #include "Platform/TelephonyService.h"
 #include "Telephony/Drives/ServiceRecords.h"
-#include "Telephony/ModemManager/ModemReport.h"
+#include "Telephony/ModemManager/Reports/ModemReport.h"
 
 #include <string>
 #include <utility>

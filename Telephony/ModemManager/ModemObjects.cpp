@@ -3,7 +3,7 @@
 
 #include "Telephony/ModemManager/ModemObjects.h"
 
-#include "Telephony/ModemManager/ModemManagerNames.h"
+#include "Telephony/ModemManager/Bus/ModemManagerNames.h"
 
 #include <algorithm>
 #include <charconv>

@@ -5,7 +5,7 @@
 
 #include "Platform/MainQueue.h"
 #include "Telephony/ModemManager/ModemFollower.h"
-#include "Telephony/ModemManager/ModemReport.h"
+#include "Telephony/ModemManager/Reports/ModemReport.h"
 
 #include <chrono>
 #include <cstdint>

@@ -1,11 +1,11 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Telephony/ModemManager/MemberTable.h"
+#include "Telephony/ModemManager/Members/MemberTable.h"
 
-#include "Telephony/ModemManager/LTEBand.h"
-#include "Telephony/ModemManager/MemberNumber.h"
-#include "Telephony/ModemManager/MemberText.h"
+#include "Telephony/ModemManager/Members/LTEBand.h"
+#include "Telephony/ModemManager/Members/MemberNumber.h"
+#include "Telephony/ModemManager/Members/MemberText.h"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>

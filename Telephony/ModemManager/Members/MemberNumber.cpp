@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Telephony/ModemManager/MemberNumber.h"
+#include "Telephony/ModemManager/Members/MemberNumber.h"
 
 #include <algorithm>
 #include <charconv>

@@ -1,11 +1,11 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Telephony/ModemManager/MemberText.h"
+#include "Telephony/ModemManager/Members/MemberText.h"
 
 #include "Platform/DateText.h"
 #include "Platform/UTF8.h"
-#include "Telephony/ModemManager/MemberNumber.h"
+#include "Telephony/ModemManager/Members/MemberNumber.h"
 
 #include <arpa/inet.h>
 

@@ -1,10 +1,10 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Telephony/ModemManager/ModemManagerBus.h"
+#include "Telephony/ModemManager/Bus/ModemManagerBus.h"
 
-#include "Telephony/ModemManager/BusValue.h"
-#include "Telephony/ModemManager/ModemManagerNames.h"
+#include "Telephony/ModemManager/Bus/BusValue.h"
+#include "Telephony/ModemManager/Bus/ModemManagerNames.h"
 
 #include <QDBusConnection>
 #include <QDBusError>

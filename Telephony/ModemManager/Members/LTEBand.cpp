@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Telephony/ModemManager/LTEBand.h"
+#include "Telephony/ModemManager/Members/LTEBand.h"
 
 #include <algorithm>
 

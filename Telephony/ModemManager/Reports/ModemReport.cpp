@@ -1,11 +1,11 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Telephony/ModemManager/ModemReport.h"
+#include "Telephony/ModemManager/Reports/ModemReport.h"
 
 #include "Platform/TelephonyService.h"
-#include "Telephony/ModemManager/MemberTable.h"
-#include "Telephony/ModemManager/ModemManagerNames.h"
+#include "Telephony/ModemManager/Bus/ModemManagerNames.h"
+#include "Telephony/ModemManager/Members/MemberTable.h"
 
 #include <algorithm>
 #include <array>
