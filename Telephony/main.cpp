@@ -5,6 +5,7 @@
 #include "Platform/Linux/MachineClock.h"
 #include "Platform/Linux/MainLoop.h"
 #include "Platform/Linux/Ports/LinuxMessagePorts.h"
+#include "Platform/Linux/Ports/PortDirectory.h"
 #include "Platform/Linux/ProgramLog.h"
 #include "Platform/Linux/QtMainQueue.h"
 #include "Platform/Linux/ServiceManager.h"
@@ -19,6 +20,7 @@
 
 #include <csignal>
 #include <cstdio>
+#include <filesystem>
 #include <string>
 
 namespace {
@@ -66,7 +68,9 @@ int serve(const Options& options, const velmora::SourceChoice& choice) {
     LinuxMessagePorts ports;
     const ServiceManager manager;
 
-    const auto source = makeSource(choice, queue, clock);
+    const auto directory = PortDirectory::openStandard();
+    const auto source =
+        makeSource(choice, queue, clock, directory ? directory->path() : std::filesystem::path());
     if (!source) {
         std::fprintf(stderr, "%s: %s\n", program, source.reason().c_str());
         return badInput;

@@ -16,8 +16,9 @@ namespace velmora {
 namespace {
 
 using Made = Result<std::unique_ptr<LogSource>>;
+using Directory = std::filesystem::path;
 
-Made make(const ScenarioChoice& choice, MainQueue& queue, const Clock& clock) {
+Made make(const ScenarioChoice& choice, MainQueue& queue, const Clock& clock, const Directory&) {
     const ScenarioKind* kind = scenarioKindNamed(choice.name);
     if (!kind)
         return Failure{"scenario is \"" + choice.name + "\", wanted one of: " + scenarioNames()};
@@ -26,7 +27,7 @@ Made make(const ScenarioChoice& choice, MainQueue& queue, const Clock& clock) {
         std::make_unique<ScenarioSource>(queue, clock, std::move(makeScenario), choice.speed));
 }
 
-Made make(const ReplayChoice& choice, MainQueue& queue, const Clock& clock) {
+Made make(const ReplayChoice& choice, MainQueue& queue, const Clock& clock, const Directory&) {
     auto open = [file = choice.file] { return openMessages(file); };
     auto source = ReplaySource::create(queue, clock, choice.file, std::move(open),
                                        {choice.speed, choice.loop, choice.technology});
@@ -35,16 +36,22 @@ Made make(const ReplayChoice& choice, MainQueue& queue, const Clock& clock) {
     return std::unique_ptr<LogSource>(*std::move(source));
 }
 
-Made make(const ModemManagerChoice& choice, MainQueue& queue, const Clock& clock) {
-    return std::unique_ptr<LogSource>(
-        std::make_unique<ModemManagerSource>(queue, clock, ModemFollower::Options{choice.modem, {}}));
+Made make(const ModemManagerChoice& choice, MainQueue& queue, const Clock& clock,
+          const Directory& directory) {
+    ModemChoice modem;
+    for (const Result<Done>& taken : {choice.modem.empty() ? Done{} : modem.setModem(choice.modem),
+                                      choice.sim.empty() ? Done{} : modem.setSIM(choice.sim)})
+        if (!taken)
+            return Failure{taken.reason()};
+    return std::unique_ptr<LogSource>(std::make_unique<ModemManagerSource>(
+        queue, clock, ModemManagerSource::Options{{std::move(modem), {}}, directory}));
 }
 
 } // namespace
 
 Result<std::unique_ptr<LogSource>> makeSource(const SourceChoice& choice, MainQueue& queue,
-                                              const Clock& clock) {
-    return std::visit([&](const auto& chosen) { return make(chosen, queue, clock); }, choice);
+                                              const Clock& clock, const std::filesystem::path& directory) {
+    return std::visit([&](const auto& chosen) { return make(chosen, queue, clock, directory); }, choice);
 }
 
 std::string sourceHelp(std::string_view program) {
@@ -58,8 +65,10 @@ std::string sourceHelp(std::string_view program) {
             "    a recording, snapshot or DLF log in recorded time; speed max is as fast as clients take it;"
             " technology, for a file that does not name its own, is one of ";
     help += technologyNames() + "\n";
-    help += "  modemmanager[,modem=INDEX]\n"
-            "    the modem that ModemManager manages, live; without INDEX the first that has a SIM\n\n";
+    help += "  modemmanager[,modem=MODEM][,sim=SIM]\n"
+            "    the modem that ModemManager manages, live: MODEM is its index, its IMEI or the path of its "
+            "device,"
+            " SIM the ICCID of its SIM; without them the first that has a SIM\n\n";
     help += "Examples:\n";
     help += call + "scenario:gsm,seed=7,speed=2\n";
     help += call + "replay:drive.pcapng,speed=max,loop\n";

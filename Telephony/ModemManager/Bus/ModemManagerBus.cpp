@@ -33,6 +33,7 @@ QDBusMessage messageOf(const BusCall& call) {
 
 BusReply replyOf(const QDBusMessage& message) {
     BusReply reply;
+    reply.sender = message.service().toStdString();
     if (message.type() == QDBusMessage::ErrorMessage) {
         reply.error = printableForLog(message.errorName().toStdString());
         reply.text = printableForLog(message.errorMessage().toStdString());
