@@ -30,7 +30,8 @@ std::string textOf(const ReplayChoice& choice) {
 }
 
 std::string textOf(const ModemManagerChoice& choice) {
-    return "modemmanager" + (choice.modem ? ",modem=" + std::to_string(*choice.modem) : std::string());
+    return "modemmanager" + (choice.modem.empty() ? "" : ",modem=" + choice.modem) +
+           (choice.sim.empty() ? "" : ",sim=" + choice.sim);
 }
 
 bool same(const ScenarioChoice& a, const ScenarioChoice& b) {
@@ -42,7 +43,7 @@ bool same(const ReplayChoice& a, const ReplayChoice& b) {
 }
 
 bool same(const ModemManagerChoice& a, const ModemManagerChoice& b) {
-    return a.modem == b.modem;
+    return a.modem == b.modem && a.sim == b.sim;
 }
 
 template <class Choice>

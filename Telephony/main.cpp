@@ -5,6 +5,7 @@
 #include "Platform/Linux/MachineClock.h"
 #include "Platform/Linux/MainLoop.h"
 #include "Platform/Linux/Ports/LinuxMessagePorts.h"
+#include "Platform/Linux/Ports/PortDirectory.h"
 #include "Platform/Linux/ProgramLog.h"
 #include "Platform/Linux/QtMainQueue.h"
 #include "Platform/Linux/ServiceManager.h"
@@ -21,6 +22,7 @@
 
 #include <csignal>
 #include <cstdio>
+#include <filesystem>
 #include <iostream>
 #include <sstream>
 #include <string>
@@ -74,7 +76,10 @@ int serve(const Options& options, const velmora::SourceChoice& choice) {
     LinuxMessagePorts ports;
     const ServiceManager manager;
 
-    const auto source = makeSource(choice, queue, clock, [] { return SignalWatcher::hasSignal(); });
+    const auto directory = PortDirectory::openStandard();
+    const auto source = makeSource(
+        choice, queue, clock,
+        {[] { return SignalWatcher::hasSignal(); }, directory ? directory->path() : std::filesystem::path()});
     if (!source) {
         complain(source.reason());
         return badInput;

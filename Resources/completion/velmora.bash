@@ -57,7 +57,7 @@ _velmora_source() {
         _filedir
         COMPREPLY=("${COMPREPLY[@]/#/replay:}")
         ;;
-    modemmanager,*) _velmora_offer modemmanager,modem= ;;
+    modemmanager,*) _velmora_offer modemmanager,modem= modemmanager,sim= ;;
     *) _velmora_offer scenario: replay: modemmanager ;;
     esac
     # An option may follow, or a name.

@@ -3,65 +3,86 @@
 
 #include "Telephony/ModemManager/ModemManagerSource.h"
 
-#include "Platform/SystemLog.h"
-#include "Platform/TelephonyService.h"
-#include "Telephony/Drives/ServiceRecords.h"
-#include "Telephony/ModemManager/ModemReport.h"
+#include "Telephony/ModemManager/ModemMessage.h"
 
 #include <string>
 #include <utility>
 
 namespace velmora {
-namespace {
 
-/// The binary form: the cells of a city fit the record's length field then.
-constexpr bool binary = true;
-
-} // namespace
-
-ModemManagerSource::ModemManagerSource(MainQueue& queue, const Clock& clock, ModemFollower::Options options)
-    : _queue(queue), _clock(clock), _follower(queue, std::move(options), *this) {}
+ModemManagerSource::ModemManagerSource(MainQueue& queue, const Clock& clock, Options options)
+    : _queue(queue), _clock(clock), _memory(std::move(options.directory)),
+      _follower(queue, std::move(options.follower), *this) {}
 
 void ModemManagerSource::start(LogSink& sink) {
     _sink = &sink;
-    beginSession();
+    _started = std::make_shared<bool>(true);
+    const std::weak_ptr<bool> started = _started;
+    _queue.async([this, started] {
+        if (!started.expired())
+            begin();
+    });
+    _queue.after(patience, [this, started] {
+        if (!started.expired() && !_follower.presence())
+            reportAbsence({});
+    });
 }
 
 void ModemManagerSource::stop() {
     _session.reset();
+    _started.reset();
     _sink = nullptr;
 }
 
-void ModemManagerSource::beginSession() {
-    if (!_sink || !_follower.modem())
-        return;
-    _session = std::make_unique<ModemSession>(
-        _queue, _follower,
-        ModemSession::Reports{
-            [this](const Dictionaries& cells) { send(records::cellInformation(cells, binary)); },
-            [this](const DictionaryRef& files) { send(records::simFiles(*files, binary)); },
-            [this](const Dictionaries& contexts) { send(records::packetContexts(contexts, binary)); }});
+void ModemManagerSource::begin() {
+    _session.reset();
+    if (_follower.modem())
+        _session = std::make_unique<ModemSession>(
+            _queue, _clock, _follower, _memory,
+            [this](std::uint32_t code, const Dictionary& root) { send(code, root); });
+    else if (_follower.presence())
+        reportAbsence(*_follower.presence());
 }
 
-void ModemManagerSource::send(const RecordBuilder& record) {
+void ModemManagerSource::reportAbsence(const Presence& presence) {
+    // The receiver may stop the source.
+    const std::weak_ptr<bool> started = _started;
+    const DictionaryRef root = rootWithoutModem(presence);
+    for (const std::uint32_t code : liveModemCodes())
+        if (!started.expired())
+            send(code, *root);
+}
+
+void ModemManagerSource::reportObstacle() {
+    const Modem* modem = _follower.modem();
+    const std::string obstacle = modem ? obstacleOf(*modem) : std::string();
+    if (obstacle.empty())
+        _follower.faults().clear("obstacle");
+    else
+        _follower.faults().report("obstacle", "modem " + std::to_string(modem->index) + ' ' + obstacle);
+}
+
+void ModemManagerSource::send(std::uint32_t code, const Dictionary& root) {
     if (_sink)
-        _sink->receive(record.message(_clock.now()));
+        _sink->receive(liveModemRecord(code, root).message(_clock.now()));
 }
 
 void ModemManagerSource::modemChosen() {
-    const bool hadModem = std::exchange(_session, nullptr) != nullptr;
-    if (hadModem) {
-        // A removed modem's measurements must not stay on the screen. Its SIM's files do, since the display
-        // never removes any.
-        send(records::cellInformation({}, binary));
-        send(records::packetContexts({}, binary));
-    }
-    updateTechnology(true);
-    beginSession();
+    // Deferred: the sink is called by the queue alone.
+    _session.reset();
+    _queue.async([this, weak = std::weak_ptr<bool>(_alive)] {
+        if (weak.expired())
+            return;
+        reportObstacle();
+        if (!_follower.owner().empty() && !std::exchange(_hasRestored, true))
+            SignalRate::restoreRemembered(_follower, _memory);
+        if (_sink)
+            begin();
+    });
 }
 
 void ModemManagerSource::modemChanged() {
-    updateTechnology(false);
+    reportObstacle();
     if (_session)
         _session->modemChanged();
 }
@@ -69,22 +90,6 @@ void ModemManagerSource::modemChanged() {
 void ModemManagerSource::objectChanged(const std::string& path, const Array& arguments) {
     if (_session)
         _session->objectChanged(path, arguments);
-}
-
-void ModemManagerSource::updateTechnology(bool newModem) {
-    const Modem* modem = _follower.modem();
-    if (!modem)
-        return;
-    // Between two networks a modem is on none; what it could do says nothing then.
-    const std::string_view technology =
-        newModem || _technology.empty() ? technologyOf(*modem) : accessTechnologyOf(*modem);
-    if (technology.empty() || technology == _technology)
-        return;
-    _technology = technology;
-    logFormat(LogPriority::Notice, "modemmanager: the technology is %s now",
-              std::string(shortTechnologyName(technology)).c_str());
-    if (_changed)
-        _changed();
 }
 
 } // namespace velmora

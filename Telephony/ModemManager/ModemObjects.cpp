@@ -3,15 +3,16 @@
 
 #include "Telephony/ModemManager/ModemObjects.h"
 
-#include "Telephony/ModemManager/ModemManagerNames.h"
+#include "Telephony/ModemManager/Bus/ModemManagerNames.h"
 
 #include <algorithm>
 #include <charconv>
+#include <optional>
 
 namespace velmora {
 namespace {
 
-constexpr std::string_view known[] = {mm::modem, mm::modem3gpp, mm::location, mm::signal};
+constexpr std::string_view known[] = {mm::modem, mm::modem3gpp, mm::modemCdma, mm::location, mm::signal};
 
 /// More than this many properties no interface has.
 constexpr std::size_t maximumProperties = 256;
@@ -111,11 +112,7 @@ const Modem* ModemObjects::find(std::string_view path) const {
     return modem == _modems.end() ? nullptr : &modem->second;
 }
 
-const Modem* ModemObjects::choose(std::optional<std::uint32_t> wanted, std::string_view current) const {
-    if (wanted) {
-        const auto modem = _modems.find(*wanted);
-        return modem == _modems.end() ? nullptr : &modem->second;
-    }
+const Modem* ModemObjects::preferred(std::string_view current) const {
     const auto withSIM =
         std::find_if(_modems.begin(), _modems.end(), [](const auto& each) { return each.second.hasSIM(); });
     const Modem* modem = find(current);

@@ -7,7 +7,6 @@
 
 #include <cstdint>
 #include <map>
-#include <optional>
 #include <string>
 #include <string_view>
 
@@ -45,9 +44,11 @@ public:
 
     /// The modem of that path; null where there is none. Valid until the next change.
     [[nodiscard]] const Modem* find(std::string_view path) const;
-    /// The modem to follow: the one of the requested index, or, without one, `current` while it has a SIM or
-    /// none has, otherwise the first with a SIM, otherwise the first. Null where there is none.
-    [[nodiscard]] const Modem* choose(std::optional<std::uint32_t> wanted, std::string_view current) const;
+    /// The modem to follow where none is chosen: `current` while it has a SIM or none has, otherwise the
+    /// first with a SIM, otherwise the first. Null where there is none.
+    [[nodiscard]] const Modem* preferred(std::string_view current) const;
+    /// All of them, by index.
+    [[nodiscard]] const std::map<std::uint32_t, Modem>& all() const { return _modems; }
     /// "0, 2"; empty where there is no modem.
     [[nodiscard]] std::string indices() const;
 

@@ -3,9 +3,8 @@
 
 #include "Telephony/ModemManager/ModemSession.h"
 
-#include "Telephony/ModemManager/ModemManagerNames.h"
-
-#include <QString>
+#include "Telephony/ModemManager/Bus/ModemManagerNames.h"
+#include "Telephony/ModemManager/Reports/PositionReport.h"
 
 #include <algorithm>
 #include <utility>
@@ -13,37 +12,59 @@
 namespace velmora {
 namespace {
 
-QVariantList interfaceArgument(std::string_view interface) {
-    return {QString::fromUtf8(interface.data(), static_cast<qsizetype>(interface.size()))};
+/// The paths in an array, an empty one for each slash that stands for no object.
+std::vector<std::string> pathsOf(const Value& member, std::size_t maximum) {
+    std::vector<std::string> paths;
+    const Array* array = member.asArray();
+    for (std::size_t i = 0; array && i < std::min(array->size(), maximum); ++i) {
+        const std::string* path = (*array)[i].asString();
+        paths.push_back(path && mm::isObject(*path) ? *path : std::string());
+    }
+    return paths;
 }
 
-void addPath(std::vector<std::string>& paths, const Value& path) {
-    const std::string* text = path.asString();
-    if (text && mm::isObject(*text) && paths.size() < maximumBearers &&
-        std::find(paths.begin(), paths.end(), *text) == paths.end())
-        paths.push_back(*text);
+void addPath(std::vector<std::string>& paths, const std::string& path) {
+    if (!path.empty() && paths.size() < maximumBearers &&
+        std::find(paths.begin(), paths.end(), path) == paths.end())
+        paths.push_back(path);
 }
 
-Value valueOf(const Dictionaries& dictionaries) {
-    const ArrayRef array = makeArray();
-    for (const DictionaryRef& each : dictionaries)
-        array->append(Value(each));
-    return array;
+std::vector<std::string> bearersOf(const Modem& modem) {
+    std::vector<std::string> bearers;
+    for (const std::string& path : pathsOf(modem[mm::modem]["Bearers"], maximumBearers))
+        addPath(bearers, path);
+    const std::string* initial = modem[mm::modem3gpp]["InitialEpsBearer"].asString();
+    if (initial && mm::isObject(*initial))
+        addPath(bearers, *initial);
+    return bearers;
+}
+
+std::string_view subjectOf(const ModemParts::Part& part) {
+    return part.interface == mm::sim ? "SIM" : "bearer";
 }
 
 } // namespace
 
-ModemSession::ModemSession(MainQueue& queue, ModemFollower& follower, Reports reports)
-    : _queue(queue), _follower(follower), _reports(std::move(reports)), _path(follower.modem()->path),
-      _name("modem " + std::to_string(follower.modem()->index)) {
+ModemSession::ModemSession(MainQueue& queue, const Clock& clock, ModemFollower& follower,
+                           const RateMemory& memory, Report report)
+    : _queue(queue), _clock(clock), _follower(follower), _report(std::move(report)),
+      _path(follower.modem()->path), _name("modem " + std::to_string(follower.modem()->index)),
+      _parts(
+          queue, follower,
+          [this](const std::string& path, const ModemParts::Part& part, const Dictionary* changed) {
+              partChanged(path, part, changed);
+          },
+          [this](const ModemParts::Part& part, const BusReply& reply) {
+              reportLater();
+              if (part.interface != mm::manager)
+                  reportFault(subjectOf(part), reply, part.interface == mm::sim ? "its SIM" : "a bearer");
+          }),
+      _rate(queue, follower, memory, _path,
+            [this](const BusReply& reply) { reportFault("levels", reply, "its levels"); }) {
     after(std::chrono::nanoseconds::zero(), [this] {
         modemChanged();
         poll();
     });
-}
-
-ModemSession::~ModemSession() {
-    restoreSignalRate();
 }
 
 void ModemSession::after(std::chrono::nanoseconds delay, std::function<void()> task) {
@@ -61,63 +82,103 @@ void ModemSession::call(const BusCall& call, std::function<void(const BusReply&)
         });
 }
 
-void ModemSession::poll() {
-    if (_partPolls > 0 && --_partPolls == 0)
-        for (const auto& [path, part] : _parts)
-            if (!part.properties)
-                readPart(path);
-    requestCells();
-}
+// The cells, and the place that replaces a missing serving cell.
 
-void ModemSession::requestCells() {
+void ModemSession::poll() {
+    if (_locationQuery.pollsToSkip > 0)
+        --_locationQuery.pollsToSkip;
     if (_cellQuery.pollsToSkip > 0) {
         --_cellQuery.pollsToSkip;
-        return askLocation({});
+        return cellsKnown();
     }
     call({.path = _path,
           .interface = mm::modem,
           .method = "GetCellInfo",
           .arguments = {},
           .timeout = cellTimeout},
-         [this](const BusReply& reply) {
-             if (reply.failed()) {
-                 refused(_cellQuery, reply, "cell information");
-                 return askLocation({});
-             }
-             _follower.faults().clear(_cellQuery.subject);
-             const Modem* modem = _follower.modem();
-             Dictionaries cells = modem ? cellsOf(reply.value, *modem) : Dictionaries();
-             if (hasServingCell(cells))
-                 return endPoll(cells);
-             askLocation(std::move(cells));
-         });
+         [this](const BusReply& reply) { cellsAnswered(reply); });
 }
 
-void ModemSession::askLocation(Dictionaries cells) {
-    const Modem* modem = _follower.modem();
-    if (_locationQuery.pollsToSkip > 0)
-        --_locationQuery.pollsToSkip;
-    else if (modem && modem->has(mm::location))
-        return call({.path = _path, .interface = mm::location, .method = "GetLocation", .arguments = {}},
-                    [this, known = std::move(cells)](const BusReply& reply) mutable {
-                        const Modem* followed = _follower.modem();
-                        if (reply.failed())
-                            refused(_locationQuery, reply, "its place in the network");
-                        else
-                            _follower.faults().clear(_locationQuery.subject);
-                        if (const DictionaryRef place =
-                                followed ? servingCellFromLocation(reply.value, *followed) : nullptr)
-                            known.insert(known.begin(), place);
-                        endPoll(known);
-                    });
-    endPoll(cells);
+void ModemSession::cellsAnswered(const BusReply& reply) {
+    _cells.cells = cellsOf(reply.value);
+    _cells.reason = reply.failed() ? reply.reason() : std::string();
+    _cells.hasSeenNeighbors |= hasNeighbor(_cells.cells);
+    if (reply.failed()) {
+        _cells.report = reply.isUnsupported() ? ModemCellReport::Unsupported
+                        : reply.isDenied()    ? ModemCellReport::NoPermission
+                                              : ModemCellReport::Failing;
+        refused(_cellQuery, reply, "cell information");
+    } else {
+        _cells.report = ModemCellReport::Reported;
+        _follower.faults().clear(_cellQuery.subject);
+    }
+    cellsKnown();
 }
 
-void ModemSession::endPoll(const Dictionaries& cells) {
+void ModemSession::cellsKnown() {
     after(cellInterval, [this] { poll(); });
-    // An empty list is reported once: it clears the display.
-    if (std::exchange(_hadCells, !cells.empty()) || !cells.empty())
-        _reports.cells(cells);
+    const Modem* modem = _follower.modem();
+    if (!modem || !modem->has(mm::location) || hasServingCell(_cells.cells) ||
+        _locationQuery.pollsToSkip > 0) {
+        _cells.location = {};
+        return reportCells();
+    }
+    _awaitsPlace = true;
+    after(placePatience, [this] {
+        if (std::exchange(_awaitsPlace, false))
+            reportCells();
+    });
+    requestLocation();
+}
+
+void ModemSession::reportCells() {
+    const Modem* modem = _follower.modem();
+    if (!modem)
+        return;
+    _cellsDue = false;
+    const DictionaryRef root = cellReportOf(_cells, *modem);
+    // Without cells, once is enough.
+    if (!(*root)[kVoxCellMonitorCells].asArray()->empty())
+        _sent.erase(LiveModemCode::cells);
+    send(LiveModemCode::cells, root);
+}
+
+void ModemSession::pollPosition() {
+    const Modem* modem = _follower.modem();
+    _positionRuns = modem && hasPosition(*modem);
+    if (!_positionRuns)
+        return;
+    if (_locationQuery.pollsToSkip == 0)
+        requestLocation();
+    after(cellInterval, [this] { pollPosition(); });
+}
+
+void ModemSession::requestLocation() {
+    if (std::exchange(_locationQuery.isPending, true))
+        return;
+    call({.path = _path,
+          .interface = mm::location,
+          .method = "GetLocation",
+          .arguments = {},
+          .timeout = locationTimeout},
+         [this](const BusReply& reply) { locationAnswered(reply); });
+}
+
+void ModemSession::locationAnswered(const BusReply& reply) {
+    _locationQuery.isPending = false;
+    _location = reply.value;
+    _locationReason = reply.failed() ? reply.reason() : std::string();
+    if (reply.failed())
+        refused(_locationQuery, reply, "its place in the network");
+    else
+        _follower.faults().clear(_locationQuery.subject);
+    reportLater();
+    // A late one counts too, until the next.
+    const bool isAwaited = std::exchange(_awaitsPlace, false);
+    if (hasServingCell(_cells.cells) || (!isAwaited && _location == _cells.location))
+        return;
+    _cells.location = _location;
+    reportCells();
 }
 
 void ModemSession::refused(Query& query, const BusReply& reply, std::string_view what) {
@@ -133,110 +194,103 @@ void ModemSession::reportFault(std::string_view subject, const BusReply& reply, 
     if (reply.isUnsupported())
         faults.report(subject, _name + " does not support " + end);
     else if (reply.isDenied())
-        faults.report(subject, "no permission to ask " + _name + " for " + end);
+        faults.report(subject, "no permission to ask " + _name + " for " + end +
+                                   (subject == _cellQuery.subject
+                                        ? "; velmora-modemmanager.conf allows it, see velmora-telephonyd(1)"
+                                        : ""));
     else
         faults.report(subject, _name + " does not give " + end);
 }
 
-void ModemSession::setSignalRate() {
-    const Modem* modem = _follower.modem();
-    const bool has = modem && modem->has(mm::signal);
-    if (std::exchange(_hadSignal, has) == has || !has)
-        return;
-    const std::int64_t* rate = (*modem)[mm::signal]["Rate"].asInteger();
-    const std::uint32_t earlier =
-        rate && *rate > 0 && *rate <= 0xFFFF ? static_cast<std::uint32_t>(*rate) : 0;
-    // Somebody has it poll as often already.
-    if (earlier != 0 && earlier <= signalRate)
-        return;
-    _earlierRate = earlier;
-    call({.path = _path, .interface = mm::signal, .method = "Setup", .arguments = {signalRate}},
-         [this](const BusReply& reply) {
-             if (!reply.failed())
-                 return _follower.faults().clear("levels");
-             _earlierRate.reset();
-             reportFault("levels", reply, "its levels");
-         });
-}
-
-void ModemSession::restoreSignalRate() {
-    if (const auto rate = std::exchange(_earlierRate, std::nullopt))
-        _follower.bus().send(
-            {.path = _path, .interface = mm::signal, .method = "Setup", .arguments = {*rate}});
-}
+// What ModemManager publishes.
 
 void ModemSession::modemChanged() {
     const Modem* modem = _follower.modem();
     if (!modem)
         return;
-    const Value& state = (*modem)[mm::modem]["State"];
-    if (!(state == _state)) {
-        // What was refused in the one state may be granted in the next.
-        _state = state;
-        _cellQuery.pollsToSkip = 0;
-        _locationQuery.pollsToSkip = 0;
-        if (!_earlierRate)
-            _hadSignal = false;
+    const Dictionary& properties = (*modem)[mm::modem];
+    const bool hasNewState = !(properties["State"] == _state);
+    if (hasNewState)
+        stateChanged(*modem);
+    if (!(properties["AccessTechnologies"] == _access)) {
+        // The place was named on the earlier technology.
+        _access = properties["AccessTechnologies"];
+        _cells.location = {};
     }
-    setSignalRate();
-    followParts();
+    followParts(*modem);
+    _rate.modemChanged(hasNewState);
+    if (!_positionRuns && hasPosition(*modem))
+        pollPosition();
     reportLater();
 }
 
-void ModemSession::followParts() {
-    const Modem& modem = *_follower.modem();
-    const std::string* sim = modem[mm::modem]["Sim"].asString();
-    _sim = modem.hasSIM() ? *sim : std::string();
-    _bearers.clear();
-    if (const Array* paths = modem[mm::modem]["Bearers"].asArray())
-        for (const Value& path : *paths)
-            addPath(_bearers, path);
-    addPath(_bearers, modem[mm::modem3gpp]["InitialEpsBearer"]);
-
-    std::map<std::string, Part> parts;
-    for (const std::string& path : _bearers)
-        parts[path].interface = mm::bearer;
-    if (!_sim.empty())
-        parts[_sim].interface = mm::sim;
-    for (auto& [path, part] : parts)
-        if (const auto known = _parts.find(path); known != _parts.end())
-            part = known->second;
-    _parts.swap(parts);
-    for (const auto& [path, part] : _parts)
-        if (!parts.contains(path))
-            readPart(path);
+void ModemSession::stateChanged(const Modem& modem) {
+    // What was refused in the one state may be granted in the next.
+    _state = modem[mm::modem]["State"];
+    _cellQuery.pollsToSkip = 0;
+    _locationQuery.pollsToSkip = 0;
+    _cellsDue = true;
 }
 
-void ModemSession::readPart(const std::string& path) {
-    call({.path = path,
-          .interface = mm::properties,
-          .method = "GetAll",
-          .arguments = interfaceArgument(_parts[path].interface)},
-         [this, path](const BusReply& reply) {
-             const auto part = _parts.find(path);
-             if (part == _parts.end())
-                 return;
-             const bool isSIM = part->second.interface == mm::sim;
-             part->second.answered = true;
-             reportLater();
-             if (reply.failed()) {
-                 _partPolls = pollsAfterRefusal;
-                 return reportFault(isSIM ? "SIM" : "bearer", reply, isSIM ? "its SIM" : "a bearer");
-             }
-             _follower.faults().clear(isSIM ? "SIM" : "bearer");
-             const DictionaryRef properties = reply.value.dictionaryRef();
-             part->second.properties = properties ? properties : makeDictionary();
-         });
+void ModemSession::simChanged() {
+    // Another subscriber, maybe in another network: nothing of the earlier one stays.
+    _cells = {};
+    _location = {};
+    _traffic.clear();
+    _cellsDue = true;
+}
+
+void ModemSession::followParts(const Modem& modem) {
+    const std::string* sim = modem[mm::modem]["Sim"].asString();
+    const std::string active = modem.hasSIM() ? *sim : std::string();
+    if (std::exchange(_sim, active) != active)
+        simChanged();
+    _slots = pathsOf(modem[mm::modem]["SimSlots"], maximumSlots);
+    const std::vector<std::string> earlier = std::exchange(_bearers, bearersOf(modem));
+    for (const std::string& path : earlier)
+        if (std::find(_bearers.begin(), _bearers.end(), path) == _bearers.end())
+            _traffic.forget(path);
+
+    std::map<std::string, std::string_view> wanted;
+    wanted.emplace(mm::rootPath, mm::manager);
+    for (const std::string& path : _bearers)
+        wanted.emplace(path, mm::bearer);
+    for (const std::string& path : _slots)
+        if (!path.empty())
+            wanted.emplace(path, mm::sim);
+    if (!_sim.empty())
+        wanted.emplace(_sim, mm::sim);
+    _parts.follow(wanted);
 }
 
 void ModemSession::objectChanged(const std::string& path, const Array& arguments) {
-    const auto part = _parts.find(path);
-    const std::string* interface = arguments.empty() ? nullptr : arguments[0].asString();
-    if (part == _parts.end() || !part->second.properties || !interface ||
-        *interface != part->second.interface)
-        return;
-    applyChange(*part->second.properties, arguments);
+    _parts.objectChanged(path, arguments);
+}
+
+void ModemSession::partChanged(const std::string& path, const ModemParts::Part& part,
+                               const Dictionary* changed) {
     reportLater();
+    if (!changed && part.interface != mm::manager)
+        _follower.faults().clear(subjectOf(part));
+    if (part.interface != mm::bearer)
+        return;
+    // The counters of another connection are no measure of this one.
+    if (!changed || changed->contains("Connected"))
+        _traffic.forget(path);
+    if (!changed || changed->contains("Connected") || changed->contains("Stats"))
+        _traffic.answer(path, *part.properties, _clock.now());
+}
+
+ModemPart ModemSession::partAt(const std::string& path) const {
+    const ModemParts::Part* part = _parts.find(path);
+    return {path, part ? part->properties : nullptr};
+}
+
+std::string ModemSession::reasonFor(const std::vector<std::string>& paths) const {
+    for (const std::string& path : paths)
+        if (const ModemParts::Part* part = _parts.find(path); part && !part->reason.empty())
+            return part->reason;
+    return {};
 }
 
 void ModemSession::reportLater() {
@@ -252,43 +306,41 @@ void ModemSession::report() {
     const Modem* modem = _follower.modem();
     if (!modem)
         return;
-    // Whoever takes a report may end the session.
+    std::vector<ModemPart> bearers;
+    for (const std::string& path : _bearers)
+        bearers.push_back(partAt(path));
+    std::vector<ModemPart> inSlots;
+    for (const std::string& path : _slots)
+        inSlots.push_back(partAt(path));
+    const ModemPart sim = partAt(_sim);
+    const Value manager(partAt(std::string(mm::rootPath)).properties);
+    const std::pair<std::uint32_t, DictionaryRef> roots[] = {
+        {LiveModemCode::registration, registrationReportOf(*modem)},
+        {LiveModemCode::link, linkReportOf(*modem)},
+        {LiveModemCode::contexts, contextReportOf(*modem, bearers, reasonFor(_bearers))},
+        {LiveModemCode::traffic, _traffic.report(*modem, _bearers)},
+        {LiveModemCode::sim, simReportOf(*modem, sim, inSlots, reasonFor({_sim}))},
+        {LiveModemCode::modem, modemReportOf(*modem, manager)},
+        {LiveModemCode::position,
+         positionReportOf(_location, *modem, hasPosition(*modem) ? _locationReason : std::string())},
+    };
+    // The receiver of a report may end the session.
     const std::weak_ptr<bool> alive = _alive;
-    reportFiles(*modem);
-    if (!alive.expired())
-        reportContexts(*modem);
-}
-
-// Parts that wait for an answer are reported together.
-
-void ModemSession::reportFiles(const Modem& modem) {
-    static const Dictionary unread;
-    const auto sim = _parts.find(_sim);
-    if (sim != _parts.end() && !sim->second.answered)
-        return;
-    const bool read = sim != _parts.end() && sim->second.properties;
-    const DictionaryRef files = simFilesOf(modem, read ? *sim->second.properties : unread);
-    if (files->empty() || Value(files) == _reportedFiles)
-        return;
-    _reportedFiles = files;
-    _reports.simFiles(files);
-}
-
-void ModemSession::reportContexts(const Modem& modem) {
-    std::vector<ModemBearer> bearers;
-    for (const std::string& path : _bearers) {
-        const Part& part = _parts[path];
-        if (!part.answered)
+    if (_cellsDue && !_awaitsPlace)
+        reportCells();
+    for (const auto& [code, root] : roots) {
+        if (alive.expired())
             return;
-        if (part.properties)
-            bearers.push_back({path, part.properties});
+        send(code, root);
     }
-    const Dictionaries contexts = contextsOf(modem, bearers);
-    Value now = valueOf(contexts);
-    if (now == _reportedContexts)
+}
+
+void ModemSession::send(std::uint32_t code, const DictionaryRef& root) {
+    Value content(root);
+    if (_sent[code] == content)
         return;
-    _reportedContexts = std::move(now);
-    _reports.contexts(contexts);
+    _sent[code] = std::move(content);
+    _report(code, *root);
 }
 
 } // namespace velmora

@@ -3,51 +3,53 @@
 
 #pragma once
 
+#include "Platform/Clock.h"
 #include "Platform/MainQueue.h"
 #include "Telephony/ModemManager/ModemFollower.h"
-#include "Telephony/ModemManager/ModemReport.h"
+#include "Telephony/ModemManager/ModemParts.h"
+#include "Telephony/ModemManager/Reports/CellReport.h"
+#include "Telephony/ModemManager/Reports/ModemReport.h"
+#include "Telephony/ModemManager/Reports/TrafficRates.h"
+#include "Telephony/ModemManager/SignalRate.h"
 
 #include <chrono>
 #include <cstdint>
 #include <functional>
 #include <map>
 #include <memory>
-#include <optional>
 #include <string>
+#include <utility>
 #include <vector>
 
 namespace velmora {
 
 /// Queries the followed modem during its lifetime, which is while a client listens and the modem is present:
-/// the cells periodically, the SIM and bearers once and then when their signals arrive. Has ModemManager poll
-/// the levels too, and restores its rate on destruction. A query is not repeated before its answer. Main
-/// thread only.
+/// the cells periodically, and the position where the satellite receiver is on; SIMs and bearers once and
+/// then when their signals arrive. Has ModemManager poll the levels too. A query is not repeated before its
+/// answer, and none waits for another one for long. Main thread only.
 class ModemSession {
 public:
-    /// The receivers of its reports. Files and contexts are reported when they have changed, cells at every
-    /// measurement.
-    struct Reports {
-        std::function<void(const Dictionaries&)> cells;
-        std::function<void(const DictionaryRef&)> simFiles;
-        std::function<void(const Dictionaries&)> contexts;
-    };
+    /// Takes the root of a message of that code of LiveModemCode. Cells are reported at every measurement,
+    /// the rest when it has changed.
+    using Report = std::function<void(std::uint32_t code, const Dictionary& root)>;
 
     /// The delay between the answer to a cell query and the next query.
     static constexpr std::chrono::seconds cellInterval{3};
     /// A refused query is retried after this many intervals, a minute: permissions may have changed
     /// meanwhile.
     static constexpr int pollsAfterRefusal = 20;
-    /// The time-out of a cell query, which is slow on a serial line.
+    /// The time-outs. Cells are slow on a serial line.
     static constexpr std::chrono::seconds cellTimeout{30};
-    /// The rate, in seconds, at which ModemManager is to poll the levels.
-    static constexpr std::uint32_t signalRate = 5;
+    static constexpr std::chrono::seconds locationTimeout{10};
+    /// How long cells without a serving cell wait for its place in the network.
+    static constexpr std::chrono::seconds placePatience{1};
     /// The delay that combines changes in quick succession into one report.
     static constexpr std::chrono::milliseconds reportDelay{100};
 
     /// Starts querying from the queue, not inside this call. All must outlive it. Precondition: the follower
     /// has a modem.
-    ModemSession(MainQueue& queue, ModemFollower& follower, Reports reports);
-    ~ModemSession();
+    ModemSession(MainQueue& queue, const Clock& clock, ModemFollower& follower, const RateMemory& memory,
+                 Report report);
     ModemSession(const ModemSession&) = delete;
     ModemSession& operator=(const ModemSession&) = delete;
 
@@ -60,53 +62,62 @@ private:
     struct Query {
         std::string_view subject;
         int pollsToSkip = 0;
-    };
-    /// The SIM or a bearer.
-    struct Part {
-        std::string_view interface;
-        bool answered = false;    ///< whether with properties or with an error
-        DictionaryRef properties; ///< null until they have been reported
+        bool isPending = false;
     };
 
     void poll();
-    void requestCells();
-    void askLocation(Dictionaries cells);
-    void endPoll(const Dictionaries& cells);
+    void cellsAnswered(const BusReply& reply);
+    void cellsKnown();
+    void pollPosition();
+    void requestLocation();
+    void locationAnswered(const BusReply& reply);
+    void reportCells();
     void refused(Query& query, const BusReply& reply, std::string_view what);
     void reportFault(std::string_view subject, const BusReply& reply, std::string_view what);
-    void setSignalRate();
-    void restoreSignalRate();
 
-    void followParts();
-    void readPart(const std::string& path);
+    void stateChanged(const Modem& modem);
+    void simChanged();
+    void followParts(const Modem& modem);
+    void partChanged(const std::string& path, const ModemParts::Part& part, const Dictionary* changed);
+    [[nodiscard]] ModemPart partAt(const std::string& path) const;
+    [[nodiscard]] std::string reasonFor(const std::vector<std::string>& paths) const;
     void reportLater();
     void report();
-    void reportFiles(const Modem& modem);
-    void reportContexts(const Modem& modem);
+    void send(std::uint32_t code, const DictionaryRef& root);
 
     void call(const BusCall& call, std::function<void(const BusReply&)> answered);
     /// Runs after the delay unless the session has ended.
     void after(std::chrono::nanoseconds delay, std::function<void()> task);
 
     MainQueue& _queue;
+    const Clock& _clock;
     ModemFollower& _follower;
-    Reports _reports;
+    Report _report;
     std::string _path; ///< the modem's
     std::string _name; ///< "modem 0", for messages
     Query _cellQuery{"cells"};
     Query _locationQuery{"place"};
-    int _partPolls = 0;                        ///< intervals until unreadable parts are retried
-    bool _hadCells = false;                    ///< the last answer had cells
-    std::optional<std::uint32_t> _earlierRate; ///< ModemManager's earlier rate; absent while it is unchanged
-    bool _hadSignal = false;
-    Value _state;                       ///< the modem's at the last change
-    std::string _sim;                   ///< the SIM's path
-    std::vector<std::string> _bearers;  ///< the bearers' paths
-    std::map<std::string, Part> _parts; ///< by path
-    Value _reportedFiles;
-    Value _reportedContexts;
-    bool _reporting = false; ///< a report is on the queue
+    CellAnswer _cells;
+    bool _awaitsPlace = false; ///< the cells wait for the place
+    bool _cellsDue = true;     ///< they are reported without a measurement too
+    Value _location;           ///< the last answer
+    std::string _locationReason;
+    bool _positionRuns = false; ///< the position is being polled
+    Value _state;               ///< the modem's at the last change
+    Value _access;
+    std::string _sim;                  ///< the active SIM's path; empty for none
+    std::vector<std::string> _slots;   ///< the path of the SIM of each slot; empty for none
+    std::vector<std::string> _bearers; ///< the bearers' paths
+    TrafficRates _traffic;
+    std::map<std::uint32_t, Value> _sent; ///< the last root by code
+    bool _reporting = false;              ///< a report is on the queue
+    ModemParts _parts;
+    SignalRate _rate;
     std::shared_ptr<bool> _alive = std::make_shared<bool>(true);
 };
+
+/// More than any modem has; further ones are skipped.
+inline constexpr std::size_t maximumBearers = 8;
+inline constexpr std::size_t maximumSlots = 8;
 
 } // namespace velmora

@@ -17,10 +17,9 @@ namespace velmora {
 namespace {
 
 using Made = Result<std::unique_ptr<LogSource>>;
+using Around = SourceSurroundings;
 
-using IsStopping = std::function<bool()>;
-
-Made make(const ScenarioChoice& choice, MainQueue& queue, const Clock& clock, const IsStopping&) {
+Made make(const ScenarioChoice& choice, MainQueue& queue, const Clock& clock, const Around&) {
     const ScenarioKind* kind = scenarioKindNamed(choice.name);
     if (!kind)
         return Failure{"scenario is \"" + choice.name + "\", wanted one of: " + scenarioNames()};
@@ -29,8 +28,8 @@ Made make(const ScenarioChoice& choice, MainQueue& queue, const Clock& clock, co
         std::make_unique<ScenarioSource>(queue, clock, std::move(makeScenario), choice.speed));
 }
 
-Made make(const ReplayChoice& choice, MainQueue& queue, const Clock& clock, const IsStopping& isStopping) {
-    auto open = [file = choice.file, isStopping] {
+Made make(const ReplayChoice& choice, MainQueue& queue, const Clock& clock, const Around& around) {
+    auto open = [file = choice.file, isStopping = around.isStopping] {
         // What is damaged is read in one call, however long it is.
         FileSource::Hooks hooks;
         hooks.mayRead = [isStopping](std::uint64_t) { return !isStopping || !isStopping(); };
@@ -43,16 +42,21 @@ Made make(const ReplayChoice& choice, MainQueue& queue, const Clock& clock, cons
     return std::unique_ptr<LogSource>(*std::move(source));
 }
 
-Made make(const ModemManagerChoice& choice, MainQueue& queue, const Clock& clock, const IsStopping&) {
-    return std::unique_ptr<LogSource>(
-        std::make_unique<ModemManagerSource>(queue, clock, ModemFollower::Options{choice.modem, {}}));
+Made make(const ModemManagerChoice& choice, MainQueue& queue, const Clock& clock, const Around& around) {
+    ModemChoice modem;
+    for (const Result<Done>& taken : {choice.modem.empty() ? Done{} : modem.setModem(choice.modem),
+                                      choice.sim.empty() ? Done{} : modem.setSIM(choice.sim)})
+        if (!taken)
+            return Failure{taken.reason()};
+    return std::unique_ptr<LogSource>(std::make_unique<ModemManagerSource>(
+        queue, clock, ModemManagerSource::Options{{std::move(modem), {}}, around.directory}));
 }
 
 } // namespace
 
 Result<std::unique_ptr<LogSource>> makeSource(const SourceChoice& choice, MainQueue& queue,
-                                              const Clock& clock, const std::function<bool()>& isStopping) {
-    return std::visit([&](const auto& chosen) { return make(chosen, queue, clock, isStopping); }, choice);
+                                              const Clock& clock, const SourceSurroundings& around) {
+    return std::visit([&](const auto& chosen) { return make(chosen, queue, clock, around); }, choice);
 }
 
 std::string sourceHelp(std::string_view program) {
@@ -66,8 +70,10 @@ std::string sourceHelp(std::string_view program) {
             "    a recording, snapshot or DLF log in recorded time; speed max is as fast as clients take it;"
             " technology, for a file that does not name its own, is one of ";
     help += technologyNames() + "\n";
-    help += "  modemmanager[,modem=INDEX]\n"
-            "    the modem that ModemManager manages, live; without INDEX the first that has a SIM\n\n";
+    help += "  modemmanager[,modem=MODEM][,sim=SIM]\n"
+            "    the modem that ModemManager manages, live: MODEM is its index, its IMEI or the path of its "
+            "device,"
+            " SIM the ICCID of its SIM; without them the first that has a SIM\n\n";
     help += "Examples:\n";
     help += call + "scenario:gsm,seed=7,speed=2\n";
     help += call + "replay:drive.pcapng,speed=max,loop\n";

@@ -9,6 +9,7 @@
 #include "Telephony/Sources/LogSource.h"
 #include "Telephony/Sources/SourceString.h"
 
+#include <filesystem>
 #include <functional>
 #include <memory>
 #include <string>
@@ -16,11 +17,17 @@
 
 namespace velmora {
 
+/// What a source may need beside queue and clock; all of it may be absent.
+struct SourceSurroundings {
+    /// A file whose damage takes long to read is left once it returns true.
+    std::function<bool()> isStopping{};
+    /// For what has to survive a crash of the service, not of the machine.
+    std::filesystem::path directory{};
+};
+
 /// Creates the chosen source. Fails for a file that cannot be played. Queue and clock must outlive it.
-/// `isStopping` may be null; a file whose damage takes long to read is left once it returns true.
 Result<std::unique_ptr<LogSource>> makeSource(const SourceChoice& choice, MainQueue& queue,
-                                              const Clock& clock,
-                                              const std::function<bool()>& isStopping = {});
+                                              const Clock& clock, const SourceSurroundings& around = {});
 
 /// The help text about the sources, with an example of each.
 [[nodiscard]] std::string sourceHelp(std::string_view program);

@@ -5,6 +5,7 @@
 
 #include "Platform/TelephonyService.h"
 #include "Telephony/Drives/ScenarioRegistry.h"
+#include "Telephony/ModemManager/ModemChoice.h"
 
 #include <charconv>
 #include <cmath>
@@ -17,6 +18,7 @@ constexpr std::string_view seedKey = "seed=";
 constexpr std::string_view speedKey = "speed=";
 constexpr std::string_view loopKey = "loop";
 constexpr std::string_view modemKey = "modem=";
+constexpr std::string_view simKey = "sim=";
 constexpr std::string_view technologyKey = "technology=";
 
 std::string quoted(std::string_view text) {
@@ -111,6 +113,17 @@ Result<SourceChoice> parseReplay(std::string_view text) {
     return SourceChoice(choice);
 }
 
+/// Takes the value of an option that is given once and that `check` accepts.
+Result<Done> parseOnce(std::string_view name, std::string_view value, const Result<Done>& check,
+                       std::string& taken) {
+    if (!taken.empty())
+        return Failure{std::string(name) + " is given twice, wanted once"};
+    if (!check)
+        return Failure{std::string(name) + " is " + quoted(value) + ", " + check.reason()};
+    taken = value;
+    return Done{};
+}
+
 /// `text` is what follows the source's name: nothing, or a comma and options.
 Result<SourceChoice> parseModemManager(std::string_view text) {
     ModemManagerChoice choice;
@@ -118,14 +131,16 @@ Result<SourceChoice> parseModemManager(std::string_view text) {
         text.remove_prefix(1);
         const std::string_view option = text.substr(0, text.find(','));
         text.remove_prefix(option.size());
-        if (!option.starts_with(modemKey))
-            return Failure{"option is " + quoted(option) + ", wanted modem=INDEX"};
-        if (choice.modem)
-            return Failure{"modem is given twice, wanted once"};
-        const std::string_view number = option.substr(modemKey.size());
-        choice.modem = numberOf<std::uint32_t>(number);
-        if (!choice.modem)
-            return Failure{"modem is " + quoted(number) + ", wanted the number at the end of its path"};
+        Result<Done> taken = Failure{"option is " + quoted(option) + ", wanted modem=MODEM or sim=SIM"};
+        if (option.starts_with(modemKey)) {
+            const std::string_view modem = option.substr(modemKey.size());
+            taken = parseOnce("modem", modem, ModemChoice().setModem(modem), choice.modem);
+        } else if (option.starts_with(simKey)) {
+            const std::string_view sim = option.substr(simKey.size());
+            taken = parseOnce("sim", sim, ModemChoice().setSIM(sim), choice.sim);
+        }
+        if (!taken)
+            return Failure{taken.reason()};
     }
     return SourceChoice(choice);
 }

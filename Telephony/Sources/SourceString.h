@@ -6,7 +6,6 @@
 #include "Platform/Result.h"
 
 #include <cstdint>
-#include <optional>
 #include <string>
 #include <string_view>
 #include <variant>
@@ -28,9 +27,10 @@ struct ReplayChoice {
     std::string technology = {}; ///< overrides the file's; a short name, empty for the file's
 };
 
-/// "modemmanager[,modem=INDEX]"
+/// "modemmanager[,modem=MODEM][,sim=SIM]"
 struct ModemManagerChoice {
-    std::optional<std::uint32_t> modem; ///< its index; any modem where there is none
+    std::string modem; ///< its index, equipment identity or path; empty for any
+    std::string sim;   ///< the ICCID or path of its SIM; empty for any
 };
 
 using SourceChoice = std::variant<ScenarioChoice, ReplayChoice, ModemManagerChoice>;
@@ -38,7 +38,7 @@ using SourceChoice = std::variant<ScenarioChoice, ReplayChoice, ModemManagerChoi
 /// The forms of a source, as help and messages show them.
 inline constexpr std::string_view sourceForms =
     "scenario:NAME[,seed=N][,speed=X], replay:FILE[,speed=X][,loop][,technology=NAME] or "
-    "modemmanager[,modem=INDEX]";
+    "modemmanager[,modem=MODEM][,sim=SIM]";
 
 /// Parses the command line's source. Options may be in any order, each once. A file's name may hold commas:
 /// what follows its last one that is no option ("loop", "speed=...", "technology=...") belongs to the name.

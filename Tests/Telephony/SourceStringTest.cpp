@@ -80,15 +80,27 @@ TEST(SourceStringTest, readsTheTechnologyOfAReplay) {
 TEST(SourceStringTest, readsModemManager) {
     struct Case {
         const char* text;
-        std::optional<std::uint32_t> modem;
+        std::string modem;
+        std::string sim;
     };
-    for (const Case& each : {Case{"modemmanager", std::nullopt}, Case{"modemmanager,modem=0", 0},
-                             Case{"modemmanager,modem=4294967295", 4294967295}}) {
+    for (const Case& each : {
+             Case{"modemmanager", "", ""},
+             Case{"modemmanager,modem=0", "0", ""},
+             Case{"modemmanager,modem=4294967295", "4294967295", ""},
+             Case{"modemmanager,modem=004999010640000", "004999010640000", ""},
+             Case{"modemmanager,modem=80A1b2C3", "80A1b2C3", ""},
+             Case{"modemmanager,modem=/sys/devices/x", "/sys/devices/x", ""},
+             Case{"modemmanager,sim=89011010000000000017", "", "89011010000000000017"},
+             Case{"modemmanager,sim=8901101000000000017F,modem=1", "1", "8901101000000000017F"},
+             Case{"modemmanager,sim=/org/freedesktop/ModemManager1/SIM/3", "",
+                  "/org/freedesktop/ModemManager1/SIM/3"},
+         }) {
         const auto choice = parseSource(each.text);
         ASSERT_TRUE(choice) << each.text;
         const auto* modem = std::get_if<ModemManagerChoice>(&*choice);
         ASSERT_TRUE(modem) << each.text;
         EXPECT_EQ(modem->modem, each.modem) << each.text;
+        EXPECT_EQ(modem->sim, each.sim) << each.text;
     }
 }
 
@@ -97,9 +109,12 @@ TEST(SourceStringTest, saysWhatIsWrong) {
         const char* text;
         std::string reason;
     };
-    const std::string kinds = ", wanted scenario:NAME[,seed=N][,speed=X], "
-                              "replay:FILE[,speed=X][,loop][,technology=NAME] or modemmanager[,modem=INDEX]";
-    const std::string indices = ", wanted the number at the end of its path";
+    const std::string kinds =
+        ", wanted scenario:NAME[,seed=N][,speed=X], "
+        "replay:FILE[,speed=X][,loop][,technology=NAME] or modemmanager[,modem=MODEM][,sim=SIM]";
+    const std::string indices =
+        ", wanted the number at the end of its path, its IMEI, or the path of its device";
+    const std::string sims = ", wanted its ICCID of 18 to 20 digits, or the path of its object";
     const std::string scenarios = ", wanted one of: " + scenarioNames();
     const std::string seeds = ", wanted a whole number from 0 to 18446744073709551615";
     const std::string technologies =
@@ -110,12 +125,19 @@ TEST(SourceStringTest, saysWhatIsWrong) {
              Case{"gsm", "source is \"gsm\"" + kinds},
              Case{"modemmanager:0", "source is \"modemmanager:0\"" + kinds},
              Case{"modemmanagers", "source is \"modemmanagers\"" + kinds},
-             Case{"modemmanager,", "option is \"\", wanted modem=INDEX"},
-             Case{"modemmanager,loop", "option is \"loop\", wanted modem=INDEX"},
+             Case{"modemmanager,", "option is \"\", wanted modem=MODEM or sim=SIM"},
+             Case{"modemmanager,loop", "option is \"loop\", wanted modem=MODEM or sim=SIM"},
              Case{"modemmanager,modem=", "modem is \"\"" + indices},
              Case{"modemmanager,modem=-1", "modem is \"-1\"" + indices},
              Case{"modemmanager,modem=4294967296", "modem is \"4294967296\"" + indices},
              Case{"modemmanager,modem=1,modem=1", "modem is given twice, wanted once"},
+             Case{"modemmanager,modem=/", "modem is \"/\"" + indices},
+             Case{"modemmanager,modem=49990106400001234", "modem is \"49990106400001234\"" + indices},
+             Case{"modemmanager,sim=", "sim is \"\"" + sims},
+             Case{"modemmanager,sim=0", "sim is \"0\"" + sims},
+             Case{"modemmanager,sim=89A11010000000000017", "sim is \"89A11010000000000017\"" + sims},
+             Case{"modemmanager,sim=//", "sim is \"//\"" + sims},
+             Case{"modemmanager,sim=/a,sim=/a", "sim is given twice, wanted once"},
              Case{"Scenario:gsm", "source is \"Scenario:gsm\"" + kinds},
              Case{"scenario:", "scenario is \"\"" + scenarios},
              Case{"scenario:nr", "scenario is \"nr\"" + scenarios},

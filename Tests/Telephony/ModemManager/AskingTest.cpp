@@ -1,9 +1,10 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Tests/Telephony/ModemManager/ModemManagerFixture.h"
+#include "Tests/Telephony/ModemManager/CellsFixture.h"
 
-#include "Platform/TelephonyService.h"
+#include <fstream>
+#include <iterator>
 
 /// When the modem is asked, how often, and what is done where it does not answer.
 
@@ -12,13 +13,12 @@ namespace {
 
 using namespace std::chrono_literals;
 using ::testing::ElementsAre;
-using ::testing::IsEmpty;
 
 const CellList oneCell = {{{"cell-type", 5U}, {"serving", true}, {"tac", "7"}}};
 
-class AskingTest : public ModemManagerTest {
+class AskingTest : public CellsFixture {
 protected:
-    explicit AskingTest(const std::string& rules = {}) : ModemManagerTest(rules) {
+    explicit AskingTest(const std::string& rules = {}) : CellsFixture(rules) {
         modem[Mock::location] = {{"Enabled", 1U}};
         modem[Mock::signal] = {{"Rate", 0U}};
         mock.answers["GetCellInfo"] = {{QVariant::fromValue(oneCell)}, {}, {}};
@@ -27,20 +27,6 @@ protected:
     }
 
     void put() { mock.put(Mock::modemPath(0), modem); }
-    void refuse(const QString& member, const QString& error, const QString& text) {
-        mock.answers[member] = {{}, error, text};
-    }
-    /// The rates that Setup was called with.
-    std::vector<uint> rates() const {
-        std::vector<uint> set;
-        for (const Mock::Call& call : mock.calls)
-            if (call.member == "Setup") {
-                EXPECT_EQ(call.path, Mock::modemPath(0));
-                EXPECT_EQ(call.arguments.size(), 1);
-                set.push_back(call.arguments.value(0).toUInt());
-            }
-        return set;
-    }
 
     InterfaceMap modem = testModem(lteAccess);
 };
@@ -51,8 +37,10 @@ TEST_F(AskingTest, nothingIsRequestedWithoutAListener) {
     queue.advance(1h);
     drain();
     listen();
-    ASSERT_TRUE(
-        passes([this] { return count(cellCode) > 0 && count(simCode) > 0 && count(contextCode) > 0; }));
+    ASSERT_TRUE(passes([this] {
+        return count(LiveModemCode::cells) > 0 && count(LiveModemCode::sim) > 0 &&
+               count(LiveModemCode::contexts) > 0;
+    }));
     source->stop();
     drain();
     const std::size_t records = sink.messages.size();
@@ -68,30 +56,33 @@ TEST_F(AskingTest, nothingIsRequestedWithoutAListener) {
     listen();
     EXPECT_TRUE(comes([this] { return mock.count("GetCellInfo") == 1; }));
     sink.messages.clear();
-    EXPECT_TRUE(passes([&] { return count(simCode) > 0 && count(contextCode) > 0; })) << "sent again";
+    EXPECT_TRUE(passes([&] { return count(LiveModemCode::sim) > 0 && count(LiveModemCode::contexts) > 0; }))
+        << "sent again";
 }
 
 TEST_F(AskingTest, cellsAreAskedEveryThreeSecondsAndNeverTwiceAtATime) {
     put();
     follow();
     listen();
-    ASSERT_TRUE(comes([this] { return count(cellCode) == 1; }));
+    ASSERT_TRUE(comes([this] { return count(LiveModemCode::cells) == 1; }));
     for (std::size_t turn = 2; turn < 5; ++turn) {
         queue.advance(2999ms);
         drain();
         EXPECT_EQ(mock.count("GetCellInfo"), turn - 1);
         queue.advance(1ms);
-        ASSERT_TRUE(comes([&] { return count(cellCode) == turn; })) << "each measurement is sent";
+        ASSERT_TRUE(comes([&] { return count(LiveModemCode::cells) == turn; })) << "each measurement is sent";
     }
+    // An answer may take ten seconds and more; meanwhile all else goes on.
     mock.held = "GetCellInfo";
     queue.advance(3s);
     ASSERT_TRUE(comes([this] { return mock.count("GetCellInfo") == 5; }));
-    queue.advance(1h);
-    mock.change(Mock::modemPath(0), Mock::modem, {{"State", 11}});
-    drain();
+    queue.advance(10s);
+    mock.change(Mock::modemPath(0), Mock::modem, {{"SignalQuality", QVariant::fromValue(Quality{17, true})}});
+    EXPECT_TRUE(becomes(LiveModemCode::link, {"kVoxLinkSignalQuality"}, 17));
     EXPECT_EQ(mock.count("GetCellInfo"), 5U);
+    const std::size_t before = count(LiveModemCode::cells);
     mock.release();
-    ASSERT_TRUE(comes([this] { return count(cellCode) == 5; }));
+    ASSERT_TRUE(comes([&] { return count(LiveModemCode::cells) == before + 1; }));
     EXPECT_EQ(mock.count("GetLocation"), 0U) << "the serving cell is known";
 }
 
@@ -104,7 +95,7 @@ TEST_F(AskingTest, anAnswerAfterTheEndIsIgnored) {
     source->stop();
     mock.release();
     drain();
-    EXPECT_EQ(count(cellCode), 0U);
+    EXPECT_TRUE(sink.messages.empty());
 }
 
 TEST_F(AskingTest, theSinkMayStopTheSource) {
@@ -139,20 +130,23 @@ TEST_F(AskingTest, anUnsupportedRequestIsReportedOnceAndRetriedAfterAMinute) {
     EXPECT_LE(clock.now() - FakeClock::defaultNow(), 3 * 60s + 20s);
     EXPECT_LE(mock.count("GetLocation"), 4U);
     EXPECT_EQ(mock.count("Setup"), 1U);
-    EXPECT_EQ(count(cellCode), 0U);
+    EXPECT_EQ(inCells("kVoxModemCellReport"), number(ModemCellReport::Unsupported));
     // The rest goes on.
-    EXPECT_EQ(at(latest(simCode), {"kSimFile_ICCID"}), Value("89011010000000000017"));
-    EXPECT_EQ(at(latest(contextCode), {"0", "Signal Quality"}), Value("60 %"));
+    EXPECT_EQ(latest(LiveModemCode::sim, {"kSimFile_ICCID"}), Value("89011010000000000017"));
+    EXPECT_EQ(latest(LiveModemCode::link, {"kVoxLinkSignalQuality"}), Value(60));
 
     mock.answers["GetCellInfo"] = {{QVariant::fromValue(oneCell)}, {}, {}};
     mock.answers["Setup"] = {{}, {}, {}};
     mock.change(Mock::modemPath(0), Mock::modem, {{"State", 11}});
-    EXPECT_TRUE(passes([this] { return count(cellCode) == 1 && rates().size() == 2; }))
-        << "another state of the modem is a reason to try";
+    EXPECT_TRUE(passes([this] {
+        return inCells("kVoxModemCellReport") == number(ModemCellReport::Reported) &&
+               mock.count("Setup") == 2;
+    })) << "another state of the modem is a reason to try";
     // Cleared in between, it is reported again.
     refuse("GetCellInfo", "org.freedesktop.ModemManager1.Error.Core.Unsupported", "no cells");
     EXPECT_TRUE(passes([this] { return warnings().size() == 4; }));
-    EXPECT_EQ(latest(cellCode), Value(makeArray())) << "what is not known any more is not shown any more";
+    EXPECT_TRUE(becomes(LiveModemCode::cells, {"kVoxCellMonitorCells"}, array({})))
+        << "what is not known any more is not shown";
 }
 
 TEST_F(AskingTest, otherFailuresAreTriedAgainAtTheNextTurn) {
@@ -174,55 +168,6 @@ TEST_F(AskingTest, otherFailuresAreTriedAgainAtTheNextTurn) {
                             "enabled)"));
 }
 
-TEST_F(AskingTest, theRateOfTheLevelsIsSetAndPutBack) {
-    put();
-    follow();
-    listen();
-    ASSERT_TRUE(comes([this] { return rates().size() == 1; }));
-    // ModemManager signals the new rate, which is no reason to set it again.
-    mock.change(Mock::modemPath(0), Mock::signal, {{"Rate", 5U}});
-    drain();
-    source->stop();
-    ASSERT_TRUE(comes([this] { return rates().size() == 2; }));
-    EXPECT_THAT(rates(), ElementsAre(5U, 0U));
-}
-
-TEST_F(AskingTest, aSlowerForeignRateIsRestoredAndAFasterOneKept) {
-    modem[Mock::signal] = {{"Rate", 30U}};
-    put();
-    follow();
-    listen();
-    ASSERT_TRUE(comes([this] { return rates().size() == 1; }));
-    source->stop();
-    ASSERT_TRUE(comes([this] { return rates().size() == 2; }));
-    mock.change(Mock::modemPath(0), Mock::signal, {{"Rate", 2U}});
-    drain();
-    listen();
-    ASSERT_TRUE(passes([this] { return count(cellCode) == 2; }));
-    source->stop();
-    drain();
-    EXPECT_THAT(rates(), ElementsAre(5U, 30U));
-}
-
-TEST_F(AskingTest, theLevelsAreSetUpOnceTheModemHasThem) {
-    modem.remove(Mock::signal);
-    modem.remove(Mock::location);
-    put();
-    follow();
-    listen();
-    ASSERT_TRUE(passes([this] { return count(cellCode) == 2; }));
-    EXPECT_THAT(rates(), IsEmpty());
-    mock.put(Mock::modemPath(0), {{Mock::signal, {{"Rate", 0U}}}});
-    ASSERT_TRUE(comes([this] { return rates().size() == 1; }));
-    mock.removeInterface(Mock::modemPath(0), Mock::signal);
-    drain();
-    mock.put(Mock::modemPath(0), {{Mock::signal, {{"Rate", 0U}}}});
-    ASSERT_TRUE(comes([this] { return rates().size() == 2; }));
-    source.reset();
-    ASSERT_TRUE(comes([this] { return rates().size() == 3; }));
-    EXPECT_THAT(rates(), ElementsAre(5U, 5U, 0U));
-}
-
 /// A bus as Debian configures the system's: what its policy does not list, it refuses to all but root.
 class DenyingBusTest : public AskingTest {
 protected:
@@ -232,18 +177,48 @@ protected:
 };
 
 TEST_F(DenyingBusTest, theLocationReplacesCellsThatMayNotBeQueried) {
-    mock.answers["GetLocation"] = {
-        {QVariant::fromValue(LocationMap{{1U, QDBusVariant(QString("001,01,0000,1A2D003,1005"))}})}, {}, {}};
+    setPlace("001,01,0000,1A2D003,1005");
     put();
     follow();
     listen();
-    ASSERT_TRUE(passes([this] { return count(cellCode) == 2; }));
+    EXPECT_EQ(at(cells(), {"0", "kVoxCellMonitorTAC"}), Value(4101));
     EXPECT_EQ(mock.count("GetCellInfo"), 0U) << "the bus keeps it";
-    EXPECT_EQ(at(latest(cellCode), {"0", "kVoxCellMonitorTAC"}), Value(4101));
+    EXPECT_EQ(inCells("kVoxModemCellReport"), number(ModemCellReport::NoPermission));
     ASSERT_EQ(warnings().size(), 1U);
     EXPECT_THAT(warnings()[0],
-                ::testing::StartsWith("modemmanager: no permission to ask modem 0 for cell information "
-                                      "(org.freedesktop.DBus.Error.AccessDenied: "));
+                ::testing::AllOf(
+                    ::testing::StartsWith("modemmanager: no permission to ask modem 0 for cell information "
+                                          "(org.freedesktop.DBus.Error.AccessDenied: "),
+                    ::testing::EndsWith("; velmora-modemmanager.conf allows it, see velmora-telephonyd(1)")));
+}
+
+/// The same bus with the policy that comes with the package.
+class AllowingBusTest : public AskingTest {
+protected:
+    AllowingBusTest() : AskingTest(denial + rules()) {}
+
+    inline static const std::string denial =
+        "<deny send_destination=\"org.freedesktop.ModemManager1\" send_type=\"method_call\"/>"
+        "<allow send_interface=\"org.freedesktop.DBus.Properties\"/>"
+        "<allow send_interface=\"org.freedesktop.DBus.ObjectManager\"/>"
+        "<allow send_interface=\"com.velmora.Test\"/>";
+    /// What is between the policy's tags.
+    static std::string rules() {
+        std::ifstream file(VELMORA_SOURCE_DIR "/Resources/velmora-modemmanager.conf");
+        const std::string text{std::istreambuf_iterator<char>(file), {}};
+        constexpr std::string_view begin = "<policy context=\"default\">";
+        const std::size_t from = text.find(begin) + begin.size();
+        return text.substr(from, text.find("</policy>") - from);
+    }
+};
+
+TEST_F(AllowingBusTest, thePackagesPolicyAllowsTheCellsAndNothingElse) {
+    put();
+    follow();
+    listen();
+    EXPECT_EQ(at(cells(), {"0", "kVoxCellMonitorTAC"}), Value(7));
+    EXPECT_EQ(inCells("kVoxModemCellReport"), number(ModemCellReport::Reported));
+    EXPECT_EQ(mock.count("Setup"), 0U) << "the bus keeps it";
 }
 
 } // namespace

@@ -1,16 +1,20 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Telephony/ModemManager/MemberTable.h"
+#include "Telephony/ModemManager/Members/MemberTable.h"
 
-#include "Telephony/ModemManager/LTEBand.h"
-#include "Telephony/ModemManager/MemberNumber.h"
-#include "Telephony/ModemManager/MemberText.h"
+#include "LogMessages/LiveModem.h"
+#include "Platform/TelephonyService.h"
+#include "Telephony/ModemManager/Members/MemberNumber.h"
+#include "Telephony/ModemManager/Members/MemberText.h"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
+#include <chrono>
 #include <cmath>
+#include <initializer_list>
+#include <memory>
 #include <set>
 #include <string>
 #include <tuple>
@@ -34,30 +38,24 @@ TEST(MemberTableTest, everyRowIsComplete) {
     }
 }
 
-TEST(MemberTableTest, noKeyOfARecordIsSetTwice) {
-    // A bearer's dictionary holds its own values and the link's.
-    std::set<std::string_view> bearer;
-    std::set<std::string_view> files;
+TEST(MemberTableTest, aKeyIsSetTwiceOnlyWhereOneMemberReplacesAnother) {
     std::set<std::tuple<MemberOf, MemberUse, std::string_view>> all;
-    for (const MemberRow& row : memberTable()) {
-        if (!setsKey(row))
-            continue;
-        EXPECT_TRUE(all.insert({row.of, row.use, row.key}).second) << row.key;
-        if (row.use == MemberUse::Bearer || row.use == MemberUse::Link) {
-            EXPECT_TRUE(bearer.insert(row.key).second) << row.key;
-        } else if (row.use == MemberUse::SIMFile) {
-            EXPECT_TRUE(files.insert(row.key).second) << row.key;
-        }
-    }
+    std::set<std::string_view> repeated;
+    for (const MemberRow& row : memberTable())
+        if (setsKey(row) && !all.insert({row.of, row.use, row.key}).second && !row.listed)
+            repeated.insert(row.key);
+    // The channel number of UMTS has three members, its frequency two.
+    EXPECT_THAT(repeated,
+                ::testing::UnorderedElementsAre(kVoxCellMonitorUARFCN, kVoxCellMonitorDownlinkFrequency));
 }
 
 TEST(MemberTableTest, credentialsAreNeverUsed) {
     Dictionary target;
-    setKeys(target, MemberUse::Bearer, MemberOf::BearerProperties,
+    setKeys(target, MemberUse::Context, MemberOf::BearerProperties,
             Dictionary{{"user", "me"}, {"password", "secret"}, {"apn", "a.test"}});
     EXPECT_EQ(target.size(), 1U);
-    EXPECT_EQ(target["APN"], Value("a.test"));
-    setKeys(target, MemberUse::Bearer, MemberOf::BearerProperties, Value("no dictionary"));
+    EXPECT_EQ(target["kVoxContextAPN"], Value("a.test"));
+    setKeys(target, MemberUse::Context, MemberOf::BearerProperties, Value("no dictionary"));
     EXPECT_EQ(target.size(), 1U);
 }
 
@@ -67,6 +65,10 @@ struct Case {
     Value given;
     Value wanted; ///< none where it is left out
 };
+
+Value array(std::initializer_list<Value> values) {
+    return std::make_shared<Array>(values);
+}
 
 TEST(MemberConversionTest, numbers) {
     using namespace convert;
@@ -80,61 +82,97 @@ TEST(MemberConversionTest, numbers) {
              Case{hexadecimalNumber<0xFFFF>, "1 ", {}},
              Case{hexadecimalNumber<0xFFFF>, 1, {}},
              Case{hexadecimalNumber<0xFFFF>, "FFFFFFFFFFFFFFFFFF", {}},
+             Case{cellIdentity<0xFFFFFFF>, "FFFFFFE", 268435454},
+             Case{cellIdentity<0xFFFFFFF>, "FFFFFFF", {}},
+             Case{cellIdentity<0xFFFFFFF>, "FFFFFFFF", {}},
+             Case{areaCode, "0", {}},
+             Case{areaCode, "1", 1},
+             Case{areaCode, "FFFD", 65533},
+             Case{areaCode, "FFFE", {}},
+             Case{areaCode, "FFFF", {}},
+             Case{areaCode, "10000", {}},
+             Case{longAreaCode, "000000", {}},
+             Case{longAreaCode, "FFFE", {}},
+             Case{longAreaCode, "FFFF", {}},
+             Case{longAreaCode, "10000", 65536},
+             Case{longAreaCode, "FFFFFD", 16777213},
+             Case{longAreaCode, "FFFFFE", {}},
+             Case{longAreaCode, "FFFFFF", {}},
+             Case{earfcn, 0, 0},
+             Case{earfcn, 65535, {}},
+             Case{earfcn, 65536, 65536},
+             Case{earfcn, 262144, {}},
+             Case{earfcn, 0x7FFFFFFF, {}},
              Case{number<511>, 511, 511},
              Case{number<511>, 512, {}},
              Case{number<511>, -1, {}},
              Case{number<511>, 5.0, {}},
-             Case{level<-150, 0>, -80.5, -81},
-             Case{level<-150, 0>, -80.49, -80},
-             Case{level<-150, 0>, -150.0, -150},
+             Case{level<-150, 0>, -80.5, -80.5},
+             Case{level<-150, 0>, -150.0, -150.0},
              Case{level<-150, 0>, -150.1, {}},
              Case{level<-150, 0>, 0.1, {}},
              Case{level<-150, 0>, -80, {}},
              Case{level<-150, 0>, std::nan(""), {}},
              Case{level<-150, 0>, -HUGE_VAL, {}},
-             Case{halfSteps, -70.0, -35},
-             Case{halfSteps, -71.0, -36},
-             Case{halfSteps, -70.9, -35},
-             Case{halfSteps, -71.1, -36},
-             Case{halfSteps, 0.0, 0},
-             Case{halfSteps, 1.0, {}},
-             Case{halfStepsOfRXLEV, 0, -56},
-             Case{halfStepsOfRXLEV, 1, -55},
-             Case{halfStepsOfRXLEV, 63, -24},
-             Case{halfStepsOfRXLEV, 64, {}},
-             Case{halfStepsOfRXLEV, -1, {}},
-             Case{halfStepsOfRXLEV, 99, {}},
+             Case{wholeLevel<1, 200>, 110, 110.0},
+             Case{wholeLevel<1, 200>, 0x7FFFFFFF, {}},
+             Case{wholeLevel<1, 200>, 110.0, {}},
+             // 3GPP TS 45.008: RXLEV 1 begins at -110 dBm, 63 at -48 dBm.
+             Case{levelOfRXLEV, 0, -111.0},
+             Case{levelOfRXLEV, 1, -110.0},
+             Case{levelOfRXLEV, 63, -48.0},
+             Case{levelOfRXLEV, 64, {}},
+             Case{levelOfRXLEV, -1, {}},
+             Case{levelOfRXLEV, 99, {}},
+             Case{frequency, 2140000, 2140000},
+             Case{frequency, 16383, {}},
+             Case{channelInFrequency, 10700, 10700},
+             Case{channelInFrequency, 0, {}},
+             Case{channelInFrequency, 2140000, {}},
+             Case{latitude, -90.0, -90.0},
+             Case{latitude, 90.5, {}},
+             Case{longitude, 180.0, 180.0},
+             Case{longitude, -181.0, {}},
              Case{countryCode, "00101", 1},
              Case{countryCode, "310260", 310},
+             Case{countryCode, "00000", {}},
              Case{networkCode, "00101", 1},
              Case{networkCode, "310260", 260},
+             Case{networkCode, "310026", 26},
+             Case{networkDigits, "00101", 2},
+             Case{networkDigits, "310026", 3},
              Case{networkCode, "3102601", {}},
              Case{countryCode, "0010", {}},
-             Case{decimalCode, "001", 1},
-             Case{decimalCode, "1234", {}},
-             Case{decimalCode, "", {}},
-             Case{decimalCode, "1a", {}},
-             // The ends of bands, and a gap between two.
-             Case{bandOfEARFCN, 0, 1},
-             Case{bandOfEARFCN, 599, 1},
-             Case{bandOfEARFCN, 600, 2},
-             Case{bandOfEARFCN, 4949, 11},
-             Case{bandOfEARFCN, 4950, {}},
-             Case{bandOfEARFCN, 5010, 12},
-             Case{bandOfEARFCN, 37750, 38},
-             Case{bandOfEARFCN, 70645, 88},
-             Case{bandOfEARFCN, 70646, {}},
-             Case{bandOfEARFCN, -1, {}},
-             Case{bandOfEARFCN, "0", {}},
+             Case{countryCodeAlone, "001", 1},
+             Case{countryCodeAlone, "000", {}},
+             Case{countryCodeAlone, "1", {}},
+             Case{networkCodeAlone, "026", 26},
+             Case{networkCodeAlone, "1234", {}},
+             Case{networkCodeAlone, "1a", {}},
+             Case{networkDigitsAlone, "026", 3},
+             Case{networkDigitsAlone, "26", 2},
+             Case{mask, 0, {}},
+             Case{mask, 1 << 14, 16384},
+             Case{mask, 0xFFFFFFFF, {}},
+             Case{flag, true, true},
+             Case{flag, 1, {}},
+             Case{qualityPercent, array({0, true}), 0},
+             Case{qualityPercent, array({100, false}), 100},
+             Case{qualityIsRecent, array({100, false}), false},
+             Case{qualityPercent, array({101, true}), {}},
+             Case{qualityIsRecent, array({101, true}), {}},
+             Case{qualityPercent, array({50, 1}), {}},
+             Case{qualityPercent, 50, {}},
+             Case{date, 1, Date(std::chrono::seconds(1))},
+             Case{date, 0, {}},
+             Case{date, -1, {}},
+             Case{date, std::int64_t(9'000'000'001), {}},
          })
         EXPECT_EQ(each.convert(each.given), each.wanted);
 }
 
 TEST(MemberConversionTest, texts) {
     using namespace convert;
-    const auto pair = [](Value a, Value b) {
-        return Value(std::make_shared<Array>(Array{std::move(a), std::move(b)}));
-    };
     for (const Case& each : {
              Case{text, "Größe 5 €", "Größe 5 €"},
              Case{text, "a\tb", {}},
@@ -142,58 +180,25 @@ TEST(MemberConversionTest, texts) {
              Case{text, std::string(129, 'a'), {}},
              Case{text, "\xC3", {}},
              Case{text, "\u0085", {}},
+             Case{textList, array({"a", 5, "", "b"}), array({"a", "b"})},
+             Case{textList, array({""}), {}},
+             Case{textList, "a", {}},
              Case{digits, "0123456789", "0123456789"},
              Case{digits, "12a", {}},
+             Case{equipment, "004999010640000", "004999010640000"},
+             Case{equipment, "A10000009296F2", "A10000009296F2"},
+             Case{equipment, "none", {}},
              Case{internetAddress, "::1", "::1"},
              Case{internetAddress, "10.0.0.1", "10.0.0.1"},
              Case{internetAddress, "10.0.0", {}},
              Case{internetAddress, "host", {}},
-             Case{networkText, "00101", "001-01"},
-             Case{networkText, "310260", "310-260"},
-             Case{networkText, "x", {}},
-             Case{modemState, -1, "Failed"},
-             Case{modemState, 11, "Connected"},
-             Case{modemState, 12, "12"},
-             Case{registrationState, 5, "Roaming"},
-             Case{registrationState, 11, "Attached for restricted services"},
-             Case{registrationState, 99, "99"},
-             Case{accessTechnologies, 1 << 14 | 1 << 15, "LTE, 5G NR"},
-             Case{accessTechnologies, 0, {}},
-             Case{accessTechnologies, std::int64_t(1) << 40, {}},
-             Case{bearerState, true, "Connected"},
-             Case{bearerState, 1, {}},
-             Case{bearerType, 3, "Dedicated"},
-             Case{bearerType, 0, {}},
-             Case{bearerType, 9, "9"},
-             Case{internetFamily, 3, "IPv4, IPv6"},
-             Case{internetFamily, 0, {}},
-             Case{configurationMethod, 1, "PPP"},
-             Case{configurationMethod, 0, {}},
-             Case{yesOrNo, true, "Yes"},
-             Case{yesOrNo, 0, {}},
-             Case{numberText, 0, "0"},
-             Case{numberText, -1, {}},
-             Case{byteCount, 1, "1 bytes"},
-             Case{seconds, 60, "60 s"},
-             Case{bitRate, 384999, "384 kbit/s"},
-             Case{bitRate, 0, {}},
-             Case{dateText, 0, {}},
-             Case{dateText, 1, "1970-01-01 00:00:01 +0000"},
-             Case{dateText, -1, {}},
-             Case{dateText, std::int64_t(9'000'000'001), {}},
-             Case{signalQuality, pair(0, true), "0 %"},
-             Case{signalQuality, pair(100, false), "100 % (not recent)"},
-             Case{signalQuality, pair(101, true), {}},
-             Case{signalQuality, pair(50, 1), {}},
-             Case{signalQuality, 50, {}},
-             Case{powerText, -90.0, "-90.0 dBm"},
-             Case{powerText, -0.05, "-0.1 dBm"},
-             Case{powerText, -0.04, "0.0 dBm"},
-             Case{powerText, -201.0, {}},
-             Case{ratioText, 13.25, "13.3 dB"},
-             Case{ratioText, std::nan(""), {}},
-             Case{percentText, 0.4, "0.4 %"},
-             Case{percentText, 100.1, {}},
+             Case{network, "00101", "00101"},
+             Case{network, "310260", "310260"},
+             Case{network, "x", {}},
+             Case{error, array({"a.b.C", "no answer"}), "a.b.C: no answer"},
+             Case{error, array({"a.b.C", ""}), "a.b.C"},
+             Case{error, array({"", ""}), {}},
+             Case{error, "a", {}},
          })
         EXPECT_EQ(each.convert(each.given), each.wanted);
 }

@@ -40,6 +40,20 @@ const QDBusArgument& operator>>(const QDBusArgument& argument, PreferredNetwork&
     return argument;
 }
 
+QDBusArgument& operator<<(QDBusArgument& argument, const BearerError& error) {
+    argument.beginStructure();
+    argument << error.name << error.text;
+    argument.endStructure();
+    return argument;
+}
+
+const QDBusArgument& operator>>(const QDBusArgument& argument, BearerError& error) {
+    argument.beginStructure();
+    argument >> error.name >> error.text;
+    argument.endStructure();
+    return argument;
+}
+
 namespace {
 
 const QString serviceName = QStringLiteral("org.freedesktop.ModemManager1");
@@ -54,6 +68,7 @@ void registerTypes() {
     qDBusRegisterMetaType<Quality>();
     qDBusRegisterMetaType<PreferredNetwork>();
     qDBusRegisterMetaType<PreferredNetworks>();
+    qDBusRegisterMetaType<BearerError>();
     qDBusRegisterMetaType<QList<QDBusObjectPath>>();
 }
 
@@ -155,7 +170,7 @@ std::size_t MockModemManager::count(const QString& member) const {
 
 bool MockModemManager::handleMessage(const QDBusMessage& message, const QDBusConnection&) {
     calls.push_back({message.path(), message.member(), message.arguments()});
-    if (message.member() == held)
+    if (message.member() == held || message.path() == heldPath)
         _waiting.push_back(message);
     else
         reply(message);
@@ -164,6 +179,7 @@ bool MockModemManager::handleMessage(const QDBusMessage& message, const QDBusCon
 
 void MockModemManager::release() {
     held.clear();
+    heldPath.clear();
     for (const QDBusMessage& message : std::exchange(_waiting, {}))
         reply(message);
 }
@@ -172,6 +188,8 @@ void MockModemManager::reply(const QDBusMessage& message) {
     const Answer given = answer(message);
     _bus.send(given.error.isEmpty() ? message.createReply(given.values)
                                     : message.createErrorReply(given.error, given.text));
+    if (setsRates && given.error.isEmpty() && message.member() == QStringLiteral("Setup"))
+        change(message.path(), signal, {{"Rate", message.arguments().value(0)}});
 }
 
 MockModemManager::Answer MockModemManager::answer(const QDBusMessage& message) const {

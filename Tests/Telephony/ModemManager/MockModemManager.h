@@ -34,6 +34,10 @@ struct PreferredNetwork { // (su)
     uint technologies = 0;
 };
 using PreferredNetworks = QList<PreferredNetwork>; // a(su)
+struct BearerError {                               // (ss)
+    QString name;
+    QString text;
+};
 
 /// ModemManager as a test makes it up, in the test's own process: it has the objects, and returns the
 /// replies, that the test says, and keeps the calls that arrive. It behaves as ModemManager 1.20 does on the
@@ -54,10 +58,14 @@ public:
 
     inline static const QString modem = QStringLiteral("org.freedesktop.ModemManager1.Modem");
     inline static const QString modem3gpp = QStringLiteral("org.freedesktop.ModemManager1.Modem.Modem3gpp");
+    inline static const QString modemCdma = QStringLiteral("org.freedesktop.ModemManager1.Modem.ModemCdma");
     inline static const QString location = QStringLiteral("org.freedesktop.ModemManager1.Modem.Location");
     inline static const QString signal = QStringLiteral("org.freedesktop.ModemManager1.Modem.Signal");
     inline static const QString sim = QStringLiteral("org.freedesktop.ModemManager1.Sim");
     inline static const QString bearer = QStringLiteral("org.freedesktop.ModemManager1.Bearer");
+    /// ModemManager itself.
+    inline static const QString manager = QStringLiteral("org.freedesktop.ModemManager1");
+    inline static const QString managerPath = QStringLiteral("/org/freedesktop/ModemManager1");
 
     [[nodiscard]] static QString modemPath(int index);
     [[nodiscard]] static QString simPath(int index);
@@ -84,9 +92,12 @@ public:
 
     /// Answers of methods by name; one without an entry is answered as unknown.
     std::map<QString, Answer> answers;
-    /// Calls of methods with that name are kept unanswered until `release`.
+    /// Calls of methods with that name, and calls of that object, are kept unanswered until `release`.
     QString held;
+    QString heldPath;
     void release();
+    /// Setup of the levels sets their rate, and signals that.
+    bool setsRates = false;
 
     std::vector<Call> calls;
     [[nodiscard]] std::size_t count(const QString& member) const;
@@ -118,3 +129,4 @@ inline constexpr uint nrAccess = 1U << 15;
 
 Q_DECLARE_METATYPE(velmora::Quality)
 Q_DECLARE_METATYPE(velmora::PreferredNetwork)
+Q_DECLARE_METATYPE(velmora::BearerError)

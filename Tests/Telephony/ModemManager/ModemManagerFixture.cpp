@@ -3,14 +3,12 @@
 
 #include "Tests/Telephony/ModemManager/ModemManagerFixture.h"
 
-#include "LogGenerator/LogGenerator.h"
 #include "LogMessages/LogMessage.h"
-#include "LogMessages/RecordTime.h"
 #include "PropertyLists/PropertyList.h"
-#include "Tests/Support/FakeResources.h"
-#include "Tests/Support/ShippedResources.h"
 
 #include <QDBusPendingCall>
+
+#include <limits>
 
 namespace velmora {
 
@@ -24,10 +22,11 @@ ModemManagerTest::~ModemManagerTest() {
     source.reset();
 }
 
-void ModemManagerTest::follow(std::optional<std::uint32_t> modem) {
-    source = std::make_unique<ModemManagerSource>(queue, clock, ModemFollower::Options{modem, bus.address()});
-    source->setTechnologyCallback([this] { ++changes; });
-    ASSERT_TRUE(comes([this] { return mock.count("GetManagedObjects") > 0; }));
+void ModemManagerTest::follow(const ModemChoice& choice) {
+    source = std::make_unique<ModemManagerSource>(
+        queue, clock, ModemManagerSource::Options{{choice, bus.address()}, directory.path()});
+    const std::size_t before = mock.count("GetManagedObjects");
+    ASSERT_TRUE(comes([&] { return mock.count("GetManagedObjects") > before; }));
     drain();
 }
 
@@ -61,41 +60,53 @@ void ModemManagerTest::drain() {
     }
 }
 
-Value ModemManagerTest::latest(std::uint16_t code) const {
+Value ModemManagerTest::latest(std::uint32_t code) const {
     for (auto message = sink.messages.rbegin(); message != sink.messages.rend(); ++message) {
         const auto header = LogMessage::parse(message->bytes());
-        if (!header || header->code != code)
+        if (!header || header->logCode() != code)
             continue;
         EXPECT_EQ(header->type, 0xFF);
-        // The length of what follows the type byte, and the time that it was sent.
-        const Bytes bytes = message->bytes();
-        EXPECT_EQ(bytes[1] | bytes[2] << 8, static_cast<int>(message->size() - 1));
-        const auto list = readPropertyList(bytes.subspan(13));
-        EXPECT_TRUE(list);
-        return list ? *list : Value();
+        // The length of what follows the type byte.
+        EXPECT_EQ(header->length(), message->size() - 1);
+        const auto root = readPropertyList(message->bytes().subspan(13));
+        EXPECT_TRUE(root);
+        return root ? *root : Value();
     }
     return {};
 }
 
-std::size_t ModemManagerTest::count(std::uint16_t code) const {
+Value ModemManagerTest::latest(std::uint32_t code, const std::vector<std::string>& path) const {
+    return at(latest(code), path);
+}
+
+std::size_t ModemManagerTest::count(std::uint32_t code) const {
     std::size_t records = 0;
     for (const Data& message : sink.messages)
-        if (const auto header = LogMessage::parse(message.bytes()); header && header->code == code)
+        if (const auto header = LogMessage::parse(message.bytes()); header && header->logCode() == code)
             ++records;
     return records;
 }
 
-Value ModemManagerTest::display(const std::string& templateName) const {
-    FakeResources resources;
-    resources.put(templateName, "plist", shippedResource(templateName + ".plist"));
-    const CapturedLog quiet;
-    const auto decoder = LogGenerator::generatorFromTechnology(source->technology(), clock);
-    if (!decoder)
-        return {};
-    Dictionary state;
-    for (const Data& message : sink.messages)
-        decoder->updateState(state, message);
-    return state["Display"];
+bool ModemManagerTest::becomes(std::uint32_t code, const std::vector<std::string>& path, const Value& value) {
+    return passes([&] { return latest(code, path) == value; });
+}
+
+double realOf(const Value& value) {
+    return value.asReal() ? *value.asReal() : std::numeric_limits<double>::quiet_NaN();
+}
+
+Value dictionary(std::initializer_list<Dictionary::Entry> entries) {
+    return std::make_shared<Dictionary>(entries);
+}
+
+Value array(std::initializer_list<Value> values) {
+    return std::make_shared<Array>(values);
+}
+
+ModemChoice modemOfIndex(std::uint32_t index) {
+    ModemChoice choice;
+    choice.index = index;
+    return choice;
 }
 
 Value at(const Value& root, const std::vector<std::string>& path) {

@@ -3,10 +3,12 @@
 
 #pragma once
 
+#include "LogMessages/LiveModem.h"
 #include "Telephony/ModemManager/ModemManagerSource.h"
 #include "Tests/Support/CapturedLog.h"
 #include "Tests/Support/FakeClock.h"
 #include "Tests/Support/FakeMainQueue.h"
+#include "Tests/Support/TemporaryDirectory.h"
 #include "Tests/Telephony/ModemManager/MockModemManager.h"
 #include "Tests/Telephony/ModemManager/PrivateBus.h"
 #include "Tests/Telephony/TelephonyTesting.h"
@@ -14,9 +16,10 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
+#include <cstdint>
 #include <functional>
+#include <initializer_list>
 #include <memory>
-#include <optional>
 #include <string>
 #include <vector>
 
@@ -32,7 +35,7 @@ protected:
     ~ModemManagerTest() override;
 
     /// Makes the source and waits until it knows which modems there are.
-    void follow(std::optional<std::uint32_t> modem = std::nullopt);
+    void follow(const ModemChoice& choice = {});
     void listen() { source->start(sink); }
 
     /// Serves the bus until the condition holds, with the tasks that are due; time stands still.
@@ -42,12 +45,13 @@ protected:
     /// Until everything that was sent on the bus so far has arrived.
     void drain();
 
-    /// The list of the latest record of that code of the extra stream; none where there is none. Expects the
-    /// record's header to be right.
-    [[nodiscard]] Value latest(std::uint16_t code) const;
-    [[nodiscard]] std::size_t count(std::uint16_t code) const;
-    /// What a decoder of the source's technology shows of all records: its display.
-    [[nodiscard]] Value display(const std::string& templateName) const;
+    /// The root of the latest message of that code; none where there is none. Expects its header to be right.
+    [[nodiscard]] Value latest(std::uint32_t code) const;
+    /// What is in it at the end of these keys.
+    [[nodiscard]] Value latest(std::uint32_t code, const std::vector<std::string>& path) const;
+    [[nodiscard]] std::size_t count(std::uint32_t code) const;
+    /// Whether the latest message comes to have that value there.
+    [[nodiscard]] bool becomes(std::uint32_t code, const std::vector<std::string>& path, const Value& value);
     [[nodiscard]] std::vector<std::string> warnings() const { return log.textsAt(LogPriority::Warning); }
 
     PrivateBus bus;
@@ -56,15 +60,18 @@ protected:
     FakeMainQueue queue{clock};
     CollectingSink sink;
     CapturedLog log{LogPriority::Notice};
+    TemporaryDirectory directory; ///< what the source remembers lies there
     std::unique_ptr<ModemManagerSource> source;
-    int changes = 0; ///< of the technology
 };
 
-/// The value at the end of keys and, for arrays, indices: at(display, {"UMTS", "UMTS Set", "0", "RSCP"}).
+/// The value at the end of keys and, for arrays, indices: at(root, {"kVoxTraffic", "0", "kVoxTrafficSent"}).
 [[nodiscard]] Value at(const Value& root, const std::vector<std::string>& path);
 
-inline constexpr std::uint16_t simCode = 0;
-inline constexpr std::uint16_t cellCode = 1;
-inline constexpr std::uint16_t contextCode = 2;
+/// The value as a real; NaN where it is none.
+[[nodiscard]] double realOf(const Value& value);
+[[nodiscard]] Value dictionary(std::initializer_list<Dictionary::Entry> entries);
+[[nodiscard]] Value array(std::initializer_list<Value> values);
+/// The choice of that index.
+[[nodiscard]] ModemChoice modemOfIndex(std::uint32_t index);
 
 } // namespace velmora

@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: MIT
 
 #include "Tests/Telephony/ModemManager/MockModemManager.h"
+#include "Tests/Telephony/ModemManager/ModemManagerFixture.h"
 #include "Tests/Telephony/ModemManager/ModemManagerProcesses.h"
 
 #include "LogMessages/LogMessage.h"
@@ -57,32 +58,6 @@ protected:
     MockModemManager mock{bus.address()};
 };
 
-TEST_F(ModemManagerProcessTest, aWatcherShowsTheModem) {
-    putModem(lteAccess);
-    serve("modemmanager", "<5>modemmanager: the technology is Ostrel_LTE now");
-    const auto watcher = watch();
-    const std::string refresh = shown(*watcher, {"Tracking Area Code", "EF-ICCID", "Signal Quality"});
-    EXPECT_THAT(refresh, HasSubstr(" Serving Cell Info\n"
-                                   " Tracking Area Code 33997\n"
-                                   " Cell Identity 27447299\n"
-                                   " Physical Cell ID 416\n"
-                                   " Freq Band Indicator 3\n"
-                                   " UARFCN 1300\n"))
-        << service->standardError();
-    EXPECT_THAT(refresh, HasSubstr(" PDP Context Info\n"
-                                   " 0\n"
-                                   " Bearer None\n"
-                                   " Registration Home\n"
-                                   " Operator 001-01\n"
-                                   " Operator Name Test Network\n"
-                                   " Modem State Registered\n"
-                                   " Access Technology LTE\n"
-                                   " Signal Quality 60 %\n"));
-    EXPECT_THAT(refresh, HasSubstr("SIM Info\n"
-                                   " EF-ICCID 89011010000000000017\n"
-                                   " EF-MSISDN +15550100\n"));
-}
-
 TEST_F(ModemManagerProcessTest, theReferenceClientReadsTheSame) {
     if (!std::filesystem::exists("/usr/bin/mmcli"))
         GTEST_SKIP() << "there is no mmcli";
@@ -94,15 +69,26 @@ TEST_F(ModemManagerProcessTest, theReferenceClientReadsTheSame) {
     EXPECT_THAT(mmcli({"-i", "0"}), HasSubstr("iccid: 89011010000000000017"));
 }
 
-TEST_F(ModemManagerProcessTest, aChangedTechnologyEndsTheChannelAndTheNextOneIsOfTheNew) {
-    putModem(lteAccess);
-    serve("modemmanager", "<5>modemmanager: the technology is Ostrel_LTE now");
+TEST_F(ModemManagerProcessTest, oneChannelLivesThroughChangesOfTechnologyAndModem) {
+    serve("modemmanager", "<4>modemmanager: no modem is there");
     TestClient client(directory.path(), "com.velmora.test.client");
     ASSERT_TRUE(client.connect());
-    EXPECT_EQ(client.technology(), "kVoxLogChannelTechnology_Ostrel_LTE");
+    EXPECT_EQ(client.technology(), "kVoxLogChannelTechnology_Modem");
     ASSERT_TRUE(client.stream());
-    ASSERT_TRUE(eventually([&] { return client.messages.size() >= 3; }));
-    const auto header = LogMessage::parse(client.messages[0].bytes());
+    EXPECT_TRUE(becomes(client, LiveModemCode::cells, {"kVoxModemPresence"}, 4)); // there is none
+
+    putModem(lteAccess);
+    const std::vector<std::string> first{"kVoxCellMonitorCells", "0"};
+    ASSERT_TRUE(eventually([&] { return !latest(client, LiveModemCode::cells, first).isNone(); }));
+    const Value cell = latest(client, LiveModemCode::cells, first);
+    EXPECT_EQ(at(cell, {"kVoxCellMonitorTAC"}), Value(33997));
+    EXPECT_EQ(at(cell, {"kVoxCellMonitorCellId"}), Value(27447299));
+    EXPECT_EQ(at(cell, {"kVoxCellMonitorPID"}), Value(416));
+    EXPECT_EQ(latest(client, LiveModemCode::cells, {"kVoxCellMonitorCells", "1", "kVoxCellMonitorRSCP"}),
+              Value(-95.0));
+    EXPECT_TRUE(becomes(client, LiveModemCode::registration, {"kVoxRegistrationPLMN"}, "00101"));
+    EXPECT_TRUE(becomes(client, LiveModemCode::sim, {"kSimFile_ICCID"}, "89011010000000000017"));
+    const auto header = LogMessage::parse(client.messages.back().bytes());
     ASSERT_TRUE(header && header->timestamp());
     const auto sent = timeOfRecord(*header->timestamp());
     ASSERT_TRUE(sent);
@@ -110,38 +96,40 @@ TEST_F(ModemManagerProcessTest, aChangedTechnologyEndsTheChannelAndTheNextOneIsO
     EXPECT_TRUE(age > -std::chrono::seconds(1) && age < 1min) << "stamped when it was sent";
 
     mock.change(Mock::modemPath(0), Mock::modem, {{"AccessTechnologies", umtsAccess}});
-    ASSERT_TRUE(eventually([&] { return !client.commands->isValid(); }));
-    EXPECT_THAT(service->standardError(),
-                HasSubstr("<5>com.velmora.vox.server.channel.1: closed, the technology is Ostrel_GSM now\n"));
-    ASSERT_TRUE(client.connect());
-    EXPECT_EQ(client.technology(), "kVoxLogChannelTechnology_Ostrel_GSM");
-    client.messages.clear();
-    ASSERT_TRUE(client.stream());
-    EXPECT_TRUE(eventually([&] { return client.messages.size() >= 3; }));
-    const auto watcher = watch();
-    EXPECT_THAT(shown(*watcher, {"UMTS Set", "UARFCN"}), HasSubstr(" UMTS Set\n"
-                                                                   " 0\n"
-                                                                   " UARFCN 10700\n"
-                                                                   " Scrambling Code 33\n"
-                                                                   " RSCP -95 dBm\n"
-                                                                   " Energy Per Chip -7 dB\n"));
+    EXPECT_TRUE(becomes(client, LiveModemCode::link, {"kVoxLinkAccessTechnologies"}, 1 << 5));
+    mock.remove(Mock::modemPath(0));
+    EXPECT_TRUE(becomes(client, LiveModemCode::cells, {"kVoxModemPresence"}, 4));
+    mock.put(Mock::modemPath(3), testModem(gsmAccess));
+    EXPECT_TRUE(becomes(client, LiveModemCode::modem, {"kVoxModemIndex"}, 3));
+    EXPECT_TRUE(client.commands->isValid());
+    EXPECT_EQ(client.technology(), "kVoxLogChannelTechnology_Modem");
 }
 
-TEST_F(ModemManagerProcessTest, aClientBeforeTheModemGetsNoTechnology) {
-    serve("modemmanager", "<4>modemmanager: no modem is there");
-    TestClient client(directory.path(), "com.velmora.test.client");
-    ASSERT_TRUE(client.connect());
-    EXPECT_EQ(client.technology(), "");
-    EXPECT_TRUE(client.commands->isValid());
-    putModem(gsmAccess);
-    ASSERT_TRUE(eventually([&] { return !client.commands->isValid(); }));
-    ASSERT_TRUE(client.connect());
-    EXPECT_EQ(client.technology(), "kVoxLogChannelTechnology_Ostrel_GSM");
+TEST_F(ModemManagerProcessTest, aServiceThatWasKilledPutsTheRateBackWhenItRunsAgain) {
+    mock.setsRates = true;
+    putModem(lteAccess);
+    serve("modemmanager", "<5>modemmanager: following modem 0 Test Modem");
+    {
+        TestClient client(directory.path(), "com.velmora.test.client");
+        ASSERT_TRUE(client.connect());
+        ASSERT_TRUE(client.stream());
+        ASSERT_TRUE(eventually([&] { return mock.count("Setup") == 1; }));
+        service->signal(SIGKILL);
+        static_cast<void>(service->exitStatus());
+    }
+    EXPECT_EQ(mock.count("Setup"), 1U);
+    serve("modemmanager", "<5>modemmanager: following modem 0 Test Modem");
+    ASSERT_TRUE(eventually([&] { return mock.count("Setup") == 2; }));
+    std::vector<uint> rates;
+    for (const Mock::Call& call : mock.calls)
+        if (call.member == "Setup")
+            rates.push_back(call.arguments.value(0).toUInt());
+    EXPECT_THAT(rates, ::testing::ElementsAre(5U, 0U));
 }
 
 TEST_F(ModemManagerProcessTest, anEndingServicePutsTheRateBack) {
     putModem(lteAccess);
-    serve("modemmanager", "<5>modemmanager: the technology is Ostrel_LTE now");
+    serve("modemmanager", "<5>modemmanager: following modem 0 Test Modem");
     TestClient client(directory.path(), "com.velmora.test.client");
     ASSERT_TRUE(client.connect());
     ASSERT_TRUE(client.stream());
@@ -152,13 +140,11 @@ TEST_F(ModemManagerProcessTest, anEndingServicePutsTheRateBack) {
     EXPECT_EQ(mock.calls.back().arguments, QVariantList{0U});
 }
 
-TEST_F(ModemManagerProcessTest, theWantedModemIsFollowed) {
+TEST_F(ModemManagerProcessTest, theChosenModemIsFollowed) {
     putModem(lteAccess);
-    mock.put(Mock::modemPath(4), testModem(gsmAccess, {{"Model", "Other"}}));
-    serve("modemmanager,modem=4", "<5>modemmanager: following modem 4 Test Other");
-    TestClient client(directory.path(), "com.velmora.test.client");
-    ASSERT_TRUE(client.connect());
-    EXPECT_EQ(client.technology(), "kVoxLogChannelTechnology_Ostrel_GSM");
+    mock.put(Mock::modemPath(4),
+             testModem(gsmAccess, {{"Model", "Other"}, {"EquipmentIdentifier", "004999010640000"}}));
+    serve("modemmanager,modem=004999010640000", "<5>modemmanager: following modem 4 Test Other");
 }
 
 TEST_F(ModemManagerProcessTest, servesWithoutABus) {
@@ -167,7 +153,9 @@ TEST_F(ModemManagerProcessTest, servesWithoutABus) {
         start(VELMORA_BUILD_DIR "/velmora-telephonyd", {"--source", "modemmanager", "--log-level", "4"});
     TestClient client(directory.path(), "com.velmora.test.client");
     ASSERT_TRUE(client.connect());
-    EXPECT_EQ(client.technology(), "");
+    EXPECT_EQ(client.technology(), "kVoxLogChannelTechnology_Modem");
+    ASSERT_TRUE(client.stream());
+    EXPECT_TRUE(becomes(client, LiveModemCode::cells, {"kVoxModemPresence"}, 1));
     EXPECT_THAT(service->standardError(), StartsWith("<4>modemmanager: no system bus ("));
     service->signal(SIGTERM);
     EXPECT_EQ(service->exitStatus(), 0);

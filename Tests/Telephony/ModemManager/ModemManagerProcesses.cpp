@@ -3,6 +3,10 @@
 
 #include "Tests/Telephony/ModemManager/ModemManagerProcesses.h"
 
+#include "LogMessages/LogMessage.h"
+#include "PropertyLists/PropertyList.h"
+#include "Tests/Telephony/ModemManager/ModemManagerFixture.h"
+
 #include <algorithm>
 #include <cstdlib>
 #include <string_view>
@@ -46,22 +50,21 @@ void ModemManagerProcesses::serve(const std::string& source, const std::string& 
         << service->standardError();
 }
 
-std::unique_ptr<TestProcess> ModemManagerProcesses::watch() const {
-    return start(VELMORA_BUILD_DIR "/velmora-log", {"watch"});
+Value ModemManagerProcesses::latest(const TestClient& client, std::uint32_t code,
+                                    const std::vector<std::string>& path) {
+    for (auto message = client.messages.rbegin(); message != client.messages.rend(); ++message) {
+        const auto header = LogMessage::parse(message->bytes());
+        if (!header || header->logCode() != code)
+            continue;
+        const auto root = readPropertyList(message->bytes().subspan(LogMessage::headerLength));
+        return root ? at(*root, path) : Value();
+    }
+    return {};
 }
 
-std::string ModemManagerProcesses::shown(const TestProcess& watcher, const std::vector<std::string>& texts) {
-    std::string refresh;
-    const bool there = eventually([&] {
-        // Each refresh is written at once.
-        const std::string output = watcher.standardOutput();
-        refresh =
-            squeezed(std::string_view(output).substr(std::min(output.size(), output.rfind("Updated "))));
-        return std::all_of(texts.begin(), texts.end(), [&refresh](const std::string& text) {
-            return refresh.find(text) != std::string::npos;
-        });
-    });
-    return there ? refresh : std::string();
+bool ModemManagerProcesses::becomes(const TestClient& client, std::uint32_t code,
+                                    const std::vector<std::string>& path, const Value& value) {
+    return eventually([&] { return latest(client, code, path) == value; });
 }
 
 std::string ModemManagerProcesses::mmcli(std::vector<std::string> arguments) const {

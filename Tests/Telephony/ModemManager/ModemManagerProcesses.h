@@ -3,12 +3,15 @@
 
 #pragma once
 
+#include "LogMessages/LiveModem.h"
+#include "PropertyLists/Value.h"
 #include "Tests/Support/TemporaryDirectory.h"
 #include "Tests/Telephony/ModemManager/PrivateBus.h"
 #include "Tests/Telephony/TelephonydProcess.h"
 
 #include <gtest/gtest.h>
 
+#include <cstdint>
 #include <memory>
 #include <string>
 #include <vector>
@@ -25,10 +28,12 @@ protected:
                                                      std::vector<std::string> arguments) const;
     /// Starts the telephony service with that source and waits until it has said `line`.
     void serve(const std::string& source, const std::string& line);
-    [[nodiscard]] std::unique_ptr<TestProcess> watch() const;
-    /// Waits until the watcher shows all of the texts in one refresh. Gives that refresh; empty where there
-    /// is none. In it and in the texts several blanks are one.
-    [[nodiscard]] static std::string shown(const TestProcess& watcher, const std::vector<std::string>& texts);
+    /// What is at the end of these keys in the client's latest message of that code.
+    [[nodiscard]] static Value latest(const TestClient& client, std::uint32_t code,
+                                      const std::vector<std::string>& path);
+    /// Waits until it is that value.
+    [[nodiscard]] static bool becomes(const TestClient& client, std::uint32_t code,
+                                      const std::vector<std::string>& path, const Value& value);
     /// Runs ModemManager's own client: its output without colours and with blanks squeezed.
     [[nodiscard]] std::string mmcli(std::vector<std::string> arguments) const;
 

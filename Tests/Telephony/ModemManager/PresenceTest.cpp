@@ -1,11 +1,9 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Tests/Telephony/ModemManager/ModemManagerFixture.h"
+#include "Tests/Telephony/ModemManager/PartsFixture.h"
 
-#include "Platform/TelephonyService.h"
-
-/// Modems, ModemManager and the bus come and go; the technology follows.
+/// Modems, ModemManager and the bus come and go; the messages say what is missing.
 
 namespace velmora {
 namespace {
@@ -15,29 +13,63 @@ using ::testing::ElementsAre;
 using ::testing::IsEmpty;
 using ::testing::MatchesRegex;
 
-class PresenceTest : public ModemManagerTest {
+class PresenceTest : public PartsFixture {
 protected:
-    /// Waits until records of the modem with that SIM come.
+    /// Waits until messages of the modem with that number come.
     [[nodiscard]] bool showsNumber(const std::string& number) {
-        return passes([&] { return at(latest(simCode), {"kSimFile_MSISDN"}) == Value(number); });
+        return becomes(LiveModemCode::sim, {"kSimFile_MSISDN"}, array({number}));
+    }
+    /// Waits until every message has nothing but this presence, and a reason that fits.
+    [[nodiscard]] bool isAbsent(ModemPresence presence, const std::string& reason = {}) {
+        return passes([&] {
+            for (const std::uint32_t code : codes) {
+                const Value root = latest(code);
+                const Dictionary* members = root.asDictionary();
+                const std::string* why = members ? (*members)["kVoxModemReason"].asString() : nullptr;
+                if (!members || !((*members)["kVoxModemPresence"] == number(presence)) ||
+                    members->size() != (why ? 2U : 1U) || !(why ? *why : std::string()).starts_with(reason))
+                    return false;
+            }
+            return true;
+        });
     }
     static InterfaceMap modemWithNumber(const QString& number, const QVariantMap& more = {}) {
         InterfaceMap modem = testModem(lteAccess, {{"OwnNumbers", QStringList(number)}});
         modem[Mock::modem].insert(more);
         return modem;
     }
+    void followBusAt(const std::string& address) {
+        source = std::make_unique<ModemManagerSource>(queue, clock,
+                                                      ModemManagerSource::Options{{{}, address}, {}});
+    }
     inline static const QVariantMap withoutSIM = {{"Sim", QVariant::fromValue(QDBusObjectPath("/"))}};
+    static constexpr std::initializer_list<std::uint32_t> codes = {
+        LiveModemCode::sim,  LiveModemCode::cells,   LiveModemCode::contexts, LiveModemCode::registration,
+        LiveModemCode::link, LiveModemCode::traffic, LiveModemCode::modem,    LiveModemCode::position};
 };
 
-TEST_F(PresenceTest, aMissingModemIsReportedOnceAndHasNoTechnology) {
+TEST_F(PresenceTest, theTechnologyIsThereFromTheStartAndStays) {
     follow();
-    EXPECT_EQ(source->technology(), "");
+    EXPECT_EQ(source->technology(), kVoxLogChannelTechnology_Modem);
+    for (const uint access : {gsmAccess, umtsAccess, lteAccess, nrAccess, 1U << 10, 0U}) {
+        mock.put(Mock::modemPath(0), testModem(access));
+        drain();
+        EXPECT_EQ(source->technology(), kVoxLogChannelTechnology_Modem);
+    }
+}
+
+TEST_F(PresenceTest, aMissingModemIsReportedOnce) {
+    follow();
     listen();
+    ASSERT_TRUE(isAbsent(ModemPresence::NoModem));
     queue.advance(10min);
     drain();
-    EXPECT_THAT(sink.messages, IsEmpty());
+    EXPECT_EQ(sink.messages.size(), 8U);
     EXPECT_THAT(warnings(), ElementsAre("modemmanager: no modem is there"));
-    EXPECT_EQ(changes, 0);
+    // Every client hears of it.
+    source->stop();
+    listen();
+    ASSERT_TRUE(passes([this] { return sink.messages.size() == 16; }));
 }
 
 TEST_F(PresenceTest, modemsArePluggedInAndOut) {
@@ -45,24 +77,12 @@ TEST_F(PresenceTest, modemsArePluggedInAndOut) {
     listen();
     mock.put(Mock::modemPath(3), modemWithNumber("+3"));
     ASSERT_TRUE(showsNumber("+3"));
-    EXPECT_EQ(source->technology(), kVoxLogChannelTechnology_Ostrel_LTE);
-    EXPECT_EQ(changes, 1);
-    EXPECT_THAT(log.textsAt(LogPriority::Notice),
-                ElementsAre("modemmanager: following modem 3 Test Modem",
-                            "modemmanager: the technology is Ostrel_LTE now"));
-    mock.answers["GetCellInfo"] = {
-        {QVariant::fromValue(CellList{{{"cell-type", 5U}, {"serving", true}, {"tac", "7"}}})}, {}, {}};
-    ASSERT_TRUE(passes([this] { return count(cellCode) > 0; }));
-
+    EXPECT_THAT(log.textsAt(LogPriority::Notice), ElementsAre("modemmanager: following modem 3 Test Modem"));
     mock.remove(Mock::modemPath(3));
-    ASSERT_TRUE(comes([this] { return at(latest(cellCode), {}) == Value(makeArray()); }));
-    EXPECT_EQ(latest(contextCode), Value(makeArray())) << "nothing of it stays on the screen";
-    EXPECT_EQ(source->technology(), kVoxLogChannelTechnology_Ostrel_LTE) << "for the screen that is there";
+    ASSERT_TRUE(isAbsent(ModemPresence::NoModem));
     EXPECT_THAT(warnings(), ::testing::Contains("modemmanager: no modem is there"));
-
     mock.put(Mock::modemPath(4), modemWithNumber("+4"));
     ASSERT_TRUE(showsNumber("+4"));
-    EXPECT_EQ(changes, 1);
 }
 
 TEST_F(PresenceTest, takesTheFirstModemWithASIM) {
@@ -86,21 +106,10 @@ TEST_F(PresenceTest, aModemWithoutSIMServesUntilThereIsOneWith) {
     mock.put(Mock::modemPath(5), modemWithNumber("+5", withoutSIM));
     follow();
     listen();
-    ASSERT_TRUE(showsNumber("+2"));
+    ASSERT_TRUE(becomes(LiveModemCode::modem, {"kVoxModemIndex"}, 2));
     mock.change(Mock::modemPath(5), Mock::modem,
                 {{"Sim", QVariant::fromValue(QDBusObjectPath(Mock::simPath(0)))}});
-    ASSERT_TRUE(showsNumber("+5"));
-}
-
-TEST_F(PresenceTest, takesTheModemThatIsWanted) {
-    mock.put(Mock::modemPath(0), modemWithNumber("+0"));
-    mock.put(Mock::modemPath(2), modemWithNumber("+2"));
-    follow(7);
-    EXPECT_THAT(warnings(), ElementsAre("modemmanager: no modem 7 is there, only: 0, 2"));
-    EXPECT_EQ(source->technology(), "");
-    listen();
-    mock.put(Mock::modemPath(7), modemWithNumber("+7", withoutSIM));
-    ASSERT_TRUE(showsNumber("+7"));
+    ASSERT_TRUE(becomes(LiveModemCode::modem, {"kVoxModemIndex"}, 5));
 }
 
 TEST_F(PresenceTest, modemManagerIsRestarted) {
@@ -109,8 +118,9 @@ TEST_F(PresenceTest, modemManagerIsRestarted) {
     listen();
     ASSERT_TRUE(showsNumber("+0"));
     mock.vanish();
-    ASSERT_TRUE(comes([this] { return latest(contextCode) == Value(makeArray()); }));
+    ASSERT_TRUE(isAbsent(ModemPresence::NoManager));
     EXPECT_THAT(warnings(), ::testing::Contains("modemmanager: ModemManager has gone"));
+    ASSERT_TRUE(isAbsent(ModemPresence::NoManager, "org.freedesktop.DBus.Error.NameHasNoOwner: "));
     sink.messages.clear();
     queue.advance(1h);
     drain();
@@ -120,19 +130,18 @@ TEST_F(PresenceTest, modemManagerIsRestarted) {
     mock.put(Mock::modemPath(0), modemWithNumber("+1"));
     mock.appear();
     ASSERT_TRUE(showsNumber("+1"));
-    EXPECT_EQ(changes, 1) << "it speaks the same technology as before";
 }
 
 TEST_F(PresenceTest, startsBeforeModemManager) {
     mock.vanish();
-    source = std::make_unique<ModemManagerSource>(queue, clock, ModemFollower::Options{{}, bus.address()});
-    ASSERT_TRUE(passes([this] { return !warnings().empty(); }));
+    followBusAt(bus.address());
+    listen();
+    ASSERT_TRUE(isAbsent(ModemPresence::NoManager, "org.freedesktop.DBus.Error.ServiceUnknown: "));
     EXPECT_THAT(warnings(),
                 ElementsAre(MatchesRegex("modemmanager: ModemManager is not there "
                                          "\\(org\\.freedesktop\\.DBus\\.Error\\.ServiceUnknown: .*\\)")));
     queue.advance(10min);
     EXPECT_EQ(warnings().size(), 1U) << "it goes on looking without a word";
-    listen();
     mock.put(Mock::modemPath(0), modemWithNumber("+0"));
     mock.appear();
     EXPECT_TRUE(showsNumber("+0"));
@@ -144,7 +153,7 @@ TEST_F(PresenceTest, outlivesTheBus) {
     listen();
     ASSERT_TRUE(showsNumber("+0"));
     bus.stop();
-    ASSERT_TRUE(comes([this] { return latest(contextCode) == Value(makeArray()); }));
+    ASSERT_TRUE(isAbsent(ModemPresence::NoBus));
     // ModemManager may be seen to go first.
     ASSERT_TRUE(passes([this] { return warnings().back().starts_with("modemmanager: no system bus ("); }));
     queue.advance(10min);
@@ -154,74 +163,48 @@ TEST_F(PresenceTest, outlivesTheBus) {
 }
 
 TEST_F(PresenceTest, thereIsNoBus) {
-    source = std::make_unique<ModemManagerSource>(
-        queue, clock, ModemFollower::Options{{}, "unix:path=/nonexistent/velmora-bus"});
+    followBusAt("unix:path=/nonexistent/velmora-bus");
     listen();
+    ASSERT_TRUE(isAbsent(ModemPresence::NoBus));
+    EXPECT_FALSE(latest(LiveModemCode::cells, {"kVoxModemReason"}).isNone());
     queue.advance(10min);
     EXPECT_THAT(warnings(), ElementsAre(MatchesRegex("modemmanager: no system bus \\(.*\\)")));
-    EXPECT_EQ(source->technology(), "");
 }
 
-/// What a modem says of its technology, and the technology that it comes to.
-struct Technology {
-    const char* name;
-    uint access;
-    uint capabilities;
-    std::string_view technology;
-};
-
-class TechnologyTest : public ModemManagerTest, public ::testing::WithParamInterface<Technology> {};
-
-TEST_P(TechnologyTest, followsTheModem) {
-    mock.put(Mock::modemPath(0),
-             testModem(GetParam().access, {{"CurrentCapabilities", GetParam().capabilities}}));
-    follow();
-    EXPECT_EQ(source->technology(), GetParam().technology);
+TEST_F(PresenceTest, aModemManagerThatDoesNotAnswer) {
+    mock.put(Mock::modemPath(0), modemWithNumber("+0"));
+    mock.held = "GetManagedObjects";
+    followBusAt(bus.address());
+    listen();
+    ASSERT_TRUE(isAbsent(ModemPresence::NoAnswer));
+    EXPECT_GE(clock.now() - FakeClock::defaultNow(), 2s);
+    mock.release();
+    EXPECT_TRUE(showsNumber("+0"));
 }
 
-constexpr std::string_view gsm = kVoxLogChannelTechnology_Ostrel_GSM;
-constexpr std::string_view lte = kVoxLogChannelTechnology_Ostrel_LTE;
-
-INSTANTIATE_TEST_SUITE_P(
-    All, TechnologyTest,
-    ::testing::Values(Technology{"gsm", 1U << 1, 0, gsm}, Technology{"gsmCompact", 1U << 2, 0, gsm},
-                      Technology{"gprs", 1U << 3, 0, gsm}, Technology{"edge", 1U << 4, 0, gsm},
-                      Technology{"umts", 1U << 5, 0, gsm}, Technology{"hsdpa", 1U << 6, 0, gsm},
-                      Technology{"hsupa", 1U << 7, 0, gsm}, Technology{"hspa", 1U << 8, 0, gsm},
-                      Technology{"hspaPlus", 1U << 9, 0, gsm}, Technology{"lte", 1U << 14, 0, lte},
-                      Technology{"nr", 1U << 15, 0, lte}, Technology{"catM", 1U << 16, 0, lte},
-                      Technology{"nbIoT", 1U << 17, 0, lte},
-                      Technology{"lteBesideUMTS", 1U << 14 | 1U << 5, 0, lte},
-                      Technology{"onNoNetwork", 0, 1U << 2 | 1U << 3, lte},
-                      Technology{"onNoNetworkWithoutLTE", 0, 1U << 2, gsm},
-                      Technology{"onNoNetworkWith5G", 0, 1U << 6, lte},
-                      Technology{"pots", 1U << 0, 1U << 0, ""}, Technology{"cdma2000", 1U << 10, 1U << 1, ""},
-                      Technology{"evdo", 1U << 12, 1U << 1, ""}, Technology{"nothing", 0, 0, ""}),
-    [](const auto& test) { return std::string(test.param.name); });
-
-TEST_F(PresenceTest, aChangedTechnologyIsReported) {
-    mock.put(Mock::modemPath(0), testModem(lteAccess));
+TEST_F(PresenceTest, aModemThatCannotBeUsedSaysWhy) {
+    mock.put(Mock::modemPath(0), testModem(0, {{"State", 2}, {"UnlockRequired", 2U}}));
     follow();
-    EXPECT_EQ(changes, 1);
-    const auto becomes = [this](const QVariant& access) {
-        mock.change(Mock::modemPath(0), Mock::modem, {{"AccessTechnologies", access}});
-        drain();
-    };
-    becomes(umtsAccess);
-    EXPECT_EQ(source->technology(), gsm);
-    EXPECT_EQ(changes, 2);
-    // Neither another of the same decoder's, nor none at all, nor rubbish changes anything.
-    for (const QVariant& access : {QVariant(gsmAccess), QVariant(0U), QVariant(1U << 10), QVariant(-1),
-                                   QVariant("LTE"), QVariant(QStringList("LTE")), QVariant(16384.0)})
-        becomes(access);
-    mock.invalidate(Mock::modemPath(0), Mock::modem, {"AccessTechnologies"});
-    drain();
-    EXPECT_EQ(source->technology(), gsm);
-    EXPECT_EQ(changes, 2);
-    becomes(lteAccess | nrAccess);
-    EXPECT_EQ(source->technology(), lte);
-    EXPECT_EQ(changes, 3);
-    EXPECT_THAT(sink.messages, IsEmpty()) << "no client listens";
+    listen();
+    ASSERT_TRUE(becomes(LiveModemCode::sim, {"kVoxModemLock"}, 2));
+    for (const std::uint32_t code : codes) {
+        EXPECT_EQ(latest(code, {"kVoxModemLock"}), Value(2));
+        EXPECT_EQ(latest(code, {"kVoxModemState"}), Value(2));
+        EXPECT_TRUE(latest(code, {"kVoxModemFailedReason"}).isNone());
+    }
+    // The second PIN protects features of the SIM, not the modem.
+    mock.change(Mock::modemPath(0), Mock::modem, {{"State", 8}, {"UnlockRequired", 3U}});
+    ASSERT_TRUE(becomes(LiveModemCode::cells, {"kVoxModemLock"}, {}));
+    mock.change(Mock::modemPath(0), Mock::modem,
+                {{"State", -1}, {"UnlockRequired", 1U}, {"StateFailedReason", 2U}});
+    ASSERT_TRUE(becomes(LiveModemCode::cells, {"kVoxModemFailedReason"}, 2));
+    EXPECT_EQ(latest(LiveModemCode::cells, {"kVoxModemState"}), Value(-1));
+    EXPECT_THAT(warnings(),
+                ::testing::IsSupersetOf({"modemmanager: modem 0 is locked (SIM PIN)",
+                                         "modemmanager: modem 0 has failed (the SIM is missing)"}));
+    mock.change(Mock::modemPath(0), Mock::modem, {{"State", 8}});
+    EXPECT_TRUE(becomes(LiveModemCode::cells, {"kVoxModemFailedReason"}, {}))
+        << "that was the earlier failure";
 }
 
 TEST_F(PresenceTest, rubbishOfTheObjectManagerIsNoModem) {
@@ -250,11 +233,11 @@ TEST_F(PresenceTest, rubbishOfTheObjectManagerIsNoModem) {
     }
     mock.emitSignal(root, manager, "InterfacesRemoved", {path("/org/freedesktop/ModemManager1/Modem/1"), 5U});
     drain();
-    EXPECT_EQ(source->technology(), "");
     EXPECT_THAT(warnings(), ElementsAre("modemmanager: no modem is there"));
     mock.put(Mock::modemPath(1), testModem(lteAccess));
     drain();
-    EXPECT_EQ(source->technology(), lte);
+    listen();
+    EXPECT_TRUE(becomes(LiveModemCode::modem, {"kVoxModemIndex"}, 1));
 }
 
 TEST_F(PresenceTest, rubbishInPlaceOfTheModemsIsNone) {
@@ -262,21 +245,28 @@ TEST_F(PresenceTest, rubbishInPlaceOfTheModemsIsNone) {
                                     QVariant(QVariantMap{{"/org/freedesktop/ModemManager1/Modem/0", 1U}})}) {
         mock.answers["GetManagedObjects"] = {{rubbish}, {}, {}};
         follow();
-        EXPECT_EQ(source->technology(), "");
+        listen();
+        EXPECT_TRUE(isAbsent(ModemPresence::NoModem));
+        source->stop();
     }
     mock.answers["GetManagedObjects"] = {{}, "org.freedesktop.DBus.Error.AccessDenied", "not yours\n\x01"};
     follow();
+    listen();
+    EXPECT_TRUE(isAbsent(ModemPresence::NoPermission, "org.freedesktop.DBus.Error.AccessDenied: not yours"));
+    source->stop();
     EXPECT_THAT(warnings(),
                 ::testing::Contains("modemmanager: no permission to ask ModemManager for its modems "
                                     "(org.freedesktop.DBus.Error.AccessDenied: not yours?\?)"));
     mock.answers["GetManagedObjects"] = {{}, "org.freedesktop.DBus.Error.Failed", QString(4000, 'x')};
     follow();
+    listen();
+    EXPECT_TRUE(isAbsent(ModemPresence::NoAnswer, "org.freedesktop.DBus.Error.Failed: xxx"));
     EXPECT_EQ(warnings().back(), "modemmanager: ModemManager does not say which modems there are "
                                  "(org.freedesktop.DBus.Error.Failed: " +
                                      std::string(200, 'x') + ")");
     mock.answers.clear();
     mock.put(Mock::modemPath(0), testModem(gsmAccess));
-    ASSERT_TRUE(passes([this] { return source->technology() == gsm; })) << "it is asked again";
+    ASSERT_TRUE(becomes(LiveModemCode::modem, {"kVoxModemIndex"}, 0)) << "it is asked again";
 }
 
 } // namespace

@@ -73,42 +73,59 @@ TEST_F(RealModemManagerTest, showsTheModemAsItIsEnabledRegistersAndConnects) {
         return service->standardError().find("<5>modemmanager: following modem 0 Velmora Responder\n") !=
                std::string::npos;
     })) << service->standardError();
-    // Disabled, it has its SIM already, and what it can do says which technology it will speak.
-    auto watcher = watch();
-    EXPECT_THAT(shown(*watcher, {"EF-ICCID", "Modem State Disabled"}),
-                HasSubstr("SIM Info\n"
-                          " EF-ICCID 89011010000000000017\n"
-                          " EF-MSISDN +15550100\n"
-                          " EF-ACTING HPLMN 001-01\n"
-                          " EF-PLMN NETWORK NAME Test Network\n"
-                          " EF-OPLMNAcT 001-02 (LTE), 999-70 (GSM, UMTS)\n"))
-        << service->standardError();
+    TestClient client(directory.path(), "com.velmora.test.client");
+    ASSERT_TRUE(client.connect());
+    ASSERT_TRUE(client.stream());
+    const auto has = [&client](std::uint32_t code, const std::vector<std::string>& path, const Value& value) {
+        return becomes(client, code, path, value);
+    };
+    // Disabled, it has its SIM already.
+    ASSERT_TRUE(has(LiveModemCode::modem, {"kVoxModemState"}, 3)) << service->standardError();
+    EXPECT_TRUE(has(LiveModemCode::modem, {"kVoxModemEquipment"}, "004999010640000"));
+    EXPECT_TRUE(has(LiveModemCode::modem, {"kVoxModemManufacturer"}, "Velmora"));
+    EXPECT_FALSE(latest(client, LiveModemCode::modem, {"kVoxModemManagerVersion"}).isNone());
+    EXPECT_TRUE(has(LiveModemCode::sim, {"kSimFile_ICCID"}, "89011010000000000017"));
+    EXPECT_TRUE(has(LiveModemCode::sim, {"kVoxSIMIMSI"}, "001010123456789"));
+    EXPECT_TRUE(has(LiveModemCode::sim, {"kVoxSIMOperatorCode"}, "00101"));
+    EXPECT_TRUE(has(LiveModemCode::sim, {"kVoxSIMOperatorName"}, "Test Network"));
+    EXPECT_TRUE(has(LiveModemCode::sim, {"kSimFile_MSISDN", "0"}, "+15550100"));
+    EXPECT_TRUE(has(LiveModemCode::sim, {"kVoxSIMPreferredNetworks", "0", "kVoxSIMOperatorCode"}, "00102"));
+    EXPECT_TRUE(
+        has(LiveModemCode::sim, {"kVoxSIMPreferredNetworks", "0", "kVoxLinkAccessTechnologies"}, 1 << 14));
 
     ASSERT_THAT(mmcli({"-m", "any", "--enable"}), HasSubstr("successfully enabled the modem"));
-    ASSERT_NE(shown(*watcher, {"Modem State Registered", "LTE RSRP", "Cell Identity"}), "");
+    ASSERT_TRUE(has(LiveModemCode::modem, {"kVoxModemState"}, 8));
     ASSERT_THAT(mmcli({"-m", "any", "--simple-connect=apn=internet.test"}),
                 HasSubstr("successfully connected the modem"));
-    const std::string refresh = shown(*watcher, {"Modem State Connected", " State Connected"});
+    ASSERT_TRUE(has(LiveModemCode::modem, {"kVoxModemState"}, 11));
     // The same, as the reference client reads it.
     EXPECT_THAT(mmcli({"-m", "any", "--location-get"}),
                 AllOf(HasSubstr("tracking area code: 001005"), HasSubstr("cell id: 01A2D003")));
-    EXPECT_THAT(refresh, HasSubstr(" Serving Cell Info\n"
-                                   " Tracking Area Code 4101\n"   // 0x1005
-                                   " Cell Identity 27447299\n")); // 0x01A2D003
+    EXPECT_TRUE(
+        has(LiveModemCode::cells, {"kVoxCellMonitorCells", "0", "kVoxCellMonitorTAC"}, 4101)); // 0x1005
+    EXPECT_TRUE(has(LiveModemCode::cells, {"kVoxCellMonitorCells", "0", "kVoxCellMonitorCellId"},
+                    27447299)); // 0x01A2D003
+    EXPECT_TRUE(has(LiveModemCode::cells, {"kVoxCellMonitorCells", "0", "kVoxCellMonitorIsPlace"}, true));
+    EXPECT_TRUE(has(LiveModemCode::cells, {"kVoxModemCellReport"}, 1));
     EXPECT_THAT(mmcli({"-m", "any", "--signal-get"}),
                 AllOf(HasSubstr("refresh rate: 5 seconds"), HasSubstr("rsrp: -90.00 dBm"),
                       HasSubstr("rsrq: -10.00 dB")));
     // +CSQ 20 of 31 is 64 %; +CESQ's 20 is -10 dB, and its 51 is -90 dBm.
-    for (const char* line : {" APN internet.test\n", " Interface abstract:", " Registration Home\n",
-                             " Operator 001-01\n", " Access Technology LTE\n", " Signal Quality 64 %\n",
-                             " LTE RSRP -90.0 dBm\n", " LTE RSRQ -10.0 dB\n"})
-        EXPECT_THAT(refresh, HasSubstr(line));
+    EXPECT_TRUE(has(LiveModemCode::link, {"kVoxLinkSignalQuality"}, 64));
+    EXPECT_TRUE(has(LiveModemCode::link, {"kVoxLinkLTE", "kVoxLinkRSRP"}, -90.0));
+    EXPECT_TRUE(has(LiveModemCode::link, {"kVoxLinkLTE", "kVoxLinkRSRQ"}, -10.0));
+    EXPECT_TRUE(has(LiveModemCode::link, {"kVoxLinkAccessTechnologies"}, 1 << 14));
+    EXPECT_TRUE(has(LiveModemCode::cells, {"kVoxCellMonitorCells", "0", "kVoxCellMonitorRSRP"}, -90.0));
+    EXPECT_TRUE(has(LiveModemCode::registration, {"kVoxRegistrationState"}, 1));
+    EXPECT_TRUE(has(LiveModemCode::registration, {"kVoxRegistrationPLMN"}, "00101"));
+    EXPECT_TRUE(has(LiveModemCode::contexts, {"kVoxContexts", "0", "kVoxContextIsConnected"}, true));
+    EXPECT_TRUE(has(LiveModemCode::contexts, {"kVoxContexts", "0", "kVoxContextAPN"}, "internet.test"));
     EXPECT_THAT(service->standardError(),
                 HasSubstr("<4>modemmanager: modem 0 does not support cell information "
                           "(org.freedesktop.ModemManager1.Error.Core.Unsupported: "));
 
-    // Nobody watches any more: the rate is as it was.
-    watcher.reset();
+    // Without a client the rate is as it was.
+    client.close();
     EXPECT_TRUE(eventually([this] {
         return mmcli({"-m", "any", "--signal-get"}).find("refresh rate: 0 seconds") != std::string::npos;
     }));

@@ -16,9 +16,9 @@ namespace velmora {
 /// Limits of what is read from one bus message. A modem's data is a few kilobytes; what exceeds these limits
 /// is implausible and skipped.
 namespace BusBounds {
-inline constexpr std::size_t text = 1024;   ///< bytes of a string
-inline constexpr std::size_t values = 8192; ///< values of a message, at all depths together
-inline constexpr int depth = 12;            ///< of containers in containers
+inline constexpr std::size_t text = 1024;    ///< bytes of a string
+inline constexpr std::size_t values = 65536; ///< values of a message, at all depths together
+inline constexpr int depth = 12;             ///< of containers in containers
 } // namespace BusBounds
 
 /// What a message of the bus holds, as a value: numbers become integers or reals, strings, object paths and

@@ -1,10 +1,10 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Telephony/ModemManager/ModemManagerBus.h"
+#include "Telephony/ModemManager/Bus/ModemManagerBus.h"
 
-#include "Telephony/ModemManager/BusValue.h"
-#include "Telephony/ModemManager/ModemManagerNames.h"
+#include "Telephony/ModemManager/Bus/BusValue.h"
+#include "Telephony/ModemManager/Bus/ModemManagerNames.h"
 
 #include <QDBusConnection>
 #include <QDBusError>
@@ -33,6 +33,7 @@ QDBusMessage messageOf(const BusCall& call) {
 
 BusReply replyOf(const QDBusMessage& message) {
     BusReply reply;
+    reply.sender = message.service().toStdString();
     if (message.type() == QDBusMessage::ErrorMessage) {
         reply.error = printableForLog(message.errorName().toStdString());
         reply.text = printableForLog(message.errorMessage().toStdString());

@@ -30,35 +30,38 @@ inline constexpr std::string_view objectManager = "org.freedesktop.DBus.ObjectMa
 inline constexpr std::string_view properties = "org.freedesktop.DBus.Properties";
 inline constexpr std::string_view modem = "org.freedesktop.ModemManager1.Modem";
 inline constexpr std::string_view modem3gpp = "org.freedesktop.ModemManager1.Modem.Modem3gpp";
+inline constexpr std::string_view modemCdma = "org.freedesktop.ModemManager1.Modem.ModemCdma";
 inline constexpr std::string_view location = "org.freedesktop.ModemManager1.Modem.Location";
 inline constexpr std::string_view signal = "org.freedesktop.ModemManager1.Modem.Signal";
 inline constexpr std::string_view sim = "org.freedesktop.ModemManager1.Sim";
 inline constexpr std::string_view bearer = "org.freedesktop.ModemManager1.Bearer";
+/// ModemManager's own, at `rootPath`.
+inline constexpr std::string_view manager = "org.freedesktop.ModemManager1";
 
 /// Bits of Modem.AccessTechnologies.
 namespace Access {
 inline constexpr std::int64_t GSM = 1 << 1 | 1 << 2 | 1 << 3 | 1 << 4;           // with compact, GPRS, EDGE
 inline constexpr std::int64_t UMTS = 1 << 5 | 1 << 6 | 1 << 7 | 1 << 8 | 1 << 9; // with HSDPA to HSPA+
-inline constexpr std::int64_t CDMA2000 = 1 << 10 | 1 << 11 | 1 << 12 | 1 << 13;  // 1xRTT, EV-DO 0, A, B
-inline constexpr std::int64_t LTE = 1 << 14 | 1 << 16 | 1 << 17;                 // with Cat-M and NB-IoT
+inline constexpr std::int64_t CDMA1x = 1 << 10;
+inline constexpr std::int64_t LTE = 1 << 14 | 1 << 16 | 1 << 17; // with Cat-M and NB-IoT
 inline constexpr std::int64_t NR = 1 << 15;
 } // namespace Access
 
-/// Bits of Modem.CurrentCapabilities.
-namespace Capability {
-inline constexpr std::int64_t GSM_UMTS = 1 << 2;
-inline constexpr std::int64_t LTE = 1 << 3;
-inline constexpr std::int64_t NR = 1 << 6;
-} // namespace Capability
-
 /// A cell's "cell-type".
 namespace CellType {
+inline constexpr std::int64_t CDMA = 1;
 inline constexpr std::int64_t GSM = 2;
 inline constexpr std::int64_t UMTS = 3;
+inline constexpr std::int64_t TDSCDMA = 4;
 inline constexpr std::int64_t LTE = 5;
+inline constexpr std::int64_t NR = 6;
 } // namespace CellType
 
-/// The bit and, in the answer of GetLocation, the key of the location in the network.
-inline constexpr std::string_view location3gppKey = "1";
+/// The bits of Location.Enabled for satellites, and the keys of what GetLocation answers: numbers of those
+/// bits, as text.
+inline constexpr std::int64_t satelliteBits = 1 << 1 | 1 << 2;
+inline constexpr std::string_view networkLocationKey = "1";
+inline constexpr std::string_view satelliteLocationKey = "2";
+inline constexpr std::string_view sentencesKey = "4";
 
 } // namespace velmora::mm

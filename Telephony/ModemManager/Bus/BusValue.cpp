@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Telephony/ModemManager/BusValue.h"
+#include "Telephony/ModemManager/Bus/BusValue.h"
 
 #include "Platform/UTF8.h"
 

@@ -31,6 +31,7 @@ struct BusReply {
     Value value;       ///< none where the method has no result, and on an error
     std::string error; ///< as the bus names it; empty where there is none
     std::string text;
+    std::string sender; ///< the address on the bus of what answered
 
     [[nodiscard]] bool failed() const { return !error.empty(); }
     /// The modem or ModemManager cannot do it.
