@@ -47,13 +47,13 @@ class EndCleanlyTest(unittest.TestCase):
 
     def test_reports_another_status(self) -> None:
         program = shell("trap 'exit 3' TERM; echo ready; while :; do sleep 0.01; done")
-        with self.assertRaisesRegex(Problem, "^sh ended with 3 on SIGTERM$"):
+        with self.assertRaisesRegex(Problem, "^sh ended with 3 on SIGTERM, wanted 0$"):
             program.end_cleanly()
         program.kill()
 
     def test_reports_the_signal(self) -> None:
         program = shell("echo ready; exec sleep 60")
-        with self.assertRaisesRegex(Problem, f"^sh ended with -{int(signal.SIGTERM)} on SIGTERM$"):
+        with self.assertRaisesRegex(Problem, f"^sh ended with -{int(signal.SIGTERM)} on SIGTERM, wanted 0$"):
             program.end_cleanly()
         program.kill()
 

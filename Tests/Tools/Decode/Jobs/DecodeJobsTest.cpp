@@ -68,11 +68,13 @@ TEST_F(DecodeJobsTest, JobsGoWithFewDescriptors) {
         arguments.push_back(path("long.pcapng"));
     ToolProcess serial(tool(arguments));
     EXPECT_EQ(serial.exitStatus(), 0);
-    // With 8 there is room for a single job, with 6 for none: they are done without processes.
+    // With 8 there is room for a single job, with 6 for none: they are done without processes. What the
+    // tests' own caller left open would not leave room for that.
     for (const char* descriptors : {"16", "8", "6"}) {
-        std::vector<std::string> words = {
-            "-c", std::string("ulimit -n ") + descriptors + "; exec \"$0\" \"$@\" --jobs 8",
-            VELMORA_BUILD_DIR "/velmora-log"};
+        std::vector<std::string> words = {"-c",
+                                          std::string("exec 3>&- 4>&- 5>&- 6>&- 7>&- 8>&- 9>&-; ulimit -n ") +
+                                              descriptors + "; exec \"$0\" \"$@\" --jobs 8",
+                                          VELMORA_BUILD_DIR "/velmora-log"};
         words.insert(words.end(), arguments.begin(), arguments.end());
         ToolProcess side(tool(words), "/bin/sh");
         EXPECT_EQ(side.exitStatus(), 0) << descriptors << ": " << side.errors();
