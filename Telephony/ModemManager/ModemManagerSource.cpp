@@ -10,9 +10,8 @@
 
 namespace velmora {
 
-ModemManagerSource::ModemManagerSource(MainQueue& queue, const Clock& clock, Options options)
-    : _queue(queue), _clock(clock), _memory(std::move(options.directory)),
-      _follower(queue, std::move(options.follower), *this) {}
+ModemManagerSource::ModemManagerSource(MainQueue& queue, const Clock& clock, const Options& options)
+    : _queue(queue), _clock(clock), _memory(options.directory), _follower(queue, options.follower, *this) {}
 
 void ModemManagerSource::start(LogSink& sink) {
     _sink = &sink;

@@ -32,7 +32,7 @@ public:
     static constexpr std::chrono::seconds patience{2};
 
     /// Looks for modems from now on. Queue and clock must outlive the source.
-    ModemManagerSource(MainQueue& queue, const Clock& clock, Options options);
+    ModemManagerSource(MainQueue& queue, const Clock& clock, const Options& options);
 
     [[nodiscard]] std::string_view technology() const override { return kVoxLogChannelTechnology_Modem; }
     void start(LogSink& sink) override;
