@@ -13,6 +13,9 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
+#include <chrono>
+#include <iomanip>
+#include <sstream>
 #include <string>
 #include <vector>
 
@@ -23,7 +26,31 @@ namespace {
 
 using testing::HasSubstr;
 
-/// The keys of a list, and its other texts and integers, in their order.
+constexpr Date from2001 = std::chrono::sys_days(std::chrono::year(2001) / 1 / 1);
+
+/// How a value that is no list shows.
+std::string shownValue(const Value& value) {
+    if (const std::string* text = value.asString())
+        return *text;
+    if (const std::int64_t* number = value.asInteger())
+        return std::to_string(*number);
+    if (const bool* flag = value.asBoolean())
+        return *flag ? "true" : "false";
+    std::ostringstream words;
+    if (const double* real = value.asReal()) {
+        words << std::setprecision(17) << *real;
+    } else if (const Date* date = value.asDate()) {
+        words << (*date - from2001).count() << ".000 s since 2001-01-01";
+    } else if (const Data* data = value.asData()) {
+        for (const std::uint8_t byte : data->bytes())
+            words << std::hex << std::setw(2) << std::setfill('0') << unsigned{byte};
+    } else {
+        ADD_FAILURE() << "a value of kind " << nameOf(value.kind());
+    }
+    return words.str();
+}
+
+/// The keys of a list, and its other values, in their order.
 struct ListTexts {
     std::string keys;
     std::string values;
@@ -39,14 +66,10 @@ struct ListTexts {
         } else if (const Array* array = value.asArray()) {
             for (const Value& element : *array)
                 add(element);
-        } else if (const std::string* text = value.asString()) {
-            put(values, *text);
-            put(all, *text);
-        } else if (const std::int64_t* number = value.asInteger()) {
-            put(values, std::to_string(*number));
-            put(all, std::to_string(*number));
         } else {
-            ADD_FAILURE() << "a value of kind " << nameOf(value.kind());
+            const std::string text = shownValue(value);
+            put(values, text);
+            put(all, text);
         }
     }
 

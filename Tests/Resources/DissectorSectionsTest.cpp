@@ -34,9 +34,10 @@ TEST(DissectorSections, followTheNameOfTheInterface) {
     EXPECT_THAT(sections("Ostrel_GSM"), ElementsAre(gsm, "", "SIM Info"));
     EXPECT_THAT(sections("Ostrel_LTE"), ElementsAre("", lte, "SIM Info"));
     EXPECT_THAT(sections("Ostrel_CDMA"), ElementsAre("", "", ""));
+    EXPECT_THAT(sections("Modem"), ElementsAre("", "", "SIM;SIM Slots"));
     // Without a technology's name those of all, each name once.
-    EXPECT_THAT(sections(""), ElementsAre(gsm, lte, "SIM Info"));
-    EXPECT_THAT(sections("eth0"), ElementsAre(gsm, lte, "SIM Info"));
+    EXPECT_THAT(sections(""), ElementsAre(gsm, lte, "SIM Info;SIM;SIM Slots"));
+    EXPECT_THAT(sections("eth0"), ElementsAre(gsm, lte, "SIM Info;SIM;SIM Slots"));
 }
 
 TEST(DissectorSections, giveWayToNamesOfRecordsInCDMA) {

@@ -260,7 +260,7 @@ TEST_F(TelephonydTest, badCommandLinesAndInputsHaveDifferentStatus) {
              Case{{"--source", "modem"},
                   2,
                   "velmora-telephonyd: source is \"modem\", wanted scenario:NAME[,seed=N][,speed=X], "
-                  "replay:FILE[,speed=X][,loop][,technology=NAME] or modemmanager[,modem=INDEX]\n"},
+                  "replay:FILE[,speed=X][,loop][,technology=NAME] or modemmanager[,modem=MODEM][,sim=SIM]\n"},
              Case{{"--source", "scenario:gsm,speed=abc"},
                   2,
                   "velmora-telephonyd: speed is \"abc\", wanted a number above 0\n"},

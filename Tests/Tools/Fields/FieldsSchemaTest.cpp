@@ -70,7 +70,8 @@ TEST_F(FieldsSchemaTest, ListsEachRoleUnitAndTechnology) {
         roles.emplace_back(row.name);
     EXPECT_EQ(listed("role"), roles);
     std::vector<std::string> units;
-    for (const Unit unit : {Unit::DBm, Unit::DB, Unit::Percent, Unit::KilobitPerSecond, Unit::Second})
+    for (const Unit unit : {Unit::DBm, Unit::DB, Unit::Percent, Unit::KilobitPerSecond, Unit::Second,
+                            Unit::Megahertz, Unit::Byte, Unit::Degree, Unit::Metre})
         units.emplace_back(nameOf(unit));
     EXPECT_EQ(listed("unit"), units);
     std::vector<std::string> technologies;
