@@ -56,11 +56,14 @@ rc::Gen<Data> anyBytes() {
     return rc::gen::map(rc::gen::arbitrary<Payload>(), [](Payload bytes) { return Data(std::move(bytes)); });
 }
 
-rc::Gen<Data> recordOfCodes(std::vector<std::uint16_t> codes) {
+rc::Gen<Data> recordOfCodes(std::vector<std::uint32_t> codes) {
     return rc::gen::map(
         rc::gen::tuple(rc::gen::elementOf(std::move(codes)), anyStamp(), rc::gen::arbitrary<Payload>()),
         [](const auto& parts) {
-            return std::apply(recordWith, std::tuple_cat(std::tuple(LogMessage::basebandType), parts));
+            const auto& [code, stamp, payload] = parts;
+            const bool isExtra = code >= LogMessage::firstExtraCode;
+            return recordWith(isExtra ? LogMessage::extraType : LogMessage::basebandType,
+                              static_cast<std::uint16_t>(code), stamp, payload);
         });
 }
 

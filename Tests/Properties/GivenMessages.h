@@ -28,9 +28,9 @@ void showValue(const GivenMessage& given, std::ostream& out);
 
 /// Any bytes, from none to some hundred.
 [[nodiscard]] rc::Gen<Data> anyBytes();
-/// A record of one of these codes with any payload, a time stamp of the hour that `inTime` begins with, and a
-/// length field that is its length: what a file without framing needs to find its end.
-[[nodiscard]] rc::Gen<Data> recordOfCodes(std::vector<std::uint16_t> codes);
+/// A record of one of these log codes with any payload, a time stamp of the hour that `inTime` begins with,
+/// and a length field that is its length: what a file without framing needs to find its end.
+[[nodiscard]] rc::Gen<Data> recordOfCodes(std::vector<std::uint32_t> codes);
 /// A record of any code: of the baseband's stream or the extra one, with a prefix or without.
 [[nodiscard]] rc::Gen<Data> anyRecord();
 /// A property list as the serialized-object technology sends it: a dictionary of texts, of lists and of
