@@ -5,9 +5,10 @@
 
 #include "Platform/Clock.h"
 #include "Platform/MainQueue.h"
+#include "Telephony/ModemManager/CellPoller.h"
+#include "Telephony/ModemManager/ModemCalls.h"
 #include "Telephony/ModemManager/ModemFollower.h"
 #include "Telephony/ModemManager/ModemParts.h"
-#include "Telephony/ModemManager/Reports/CellReport.h"
 #include "Telephony/ModemManager/Reports/ModemReport.h"
 #include "Telephony/ModemManager/Reports/TrafficRates.h"
 #include "Telephony/ModemManager/SignalRate.h"
@@ -33,16 +34,6 @@ public:
     /// the rest when it has changed.
     using Report = std::function<void(std::uint32_t code, const Dictionary& root)>;
 
-    /// The delay between the answer to a cell query and the next query.
-    static constexpr std::chrono::seconds cellInterval{3};
-    /// A refused query is retried after this many intervals, a minute: permissions may have changed
-    /// meanwhile.
-    static constexpr int pollsAfterRefusal = 20;
-    /// The time-outs. Cells are slow on a serial line.
-    static constexpr std::chrono::seconds cellTimeout{30};
-    static constexpr std::chrono::seconds locationTimeout{10};
-    /// How long cells without a serving cell wait for its place in the network.
-    static constexpr std::chrono::seconds placePatience{1};
     /// The delay that combines changes in quick succession into one report.
     static constexpr std::chrono::milliseconds reportDelay{100};
 
@@ -58,24 +49,6 @@ public:
     void objectChanged(const std::string& path, const Array& arguments);
 
 private:
-    /// A query that may be refused, and for how many intervals it is skipped.
-    struct Query {
-        std::string_view subject;
-        int pollsToSkip = 0;
-        bool isPending = false;
-    };
-
-    void poll();
-    void cellsAnswered(const BusReply& reply);
-    void cellsKnown();
-    void pollPosition();
-    void requestLocation();
-    void locationAnswered(const BusReply& reply);
-    void reportCells();
-    void refused(Query& query, const BusReply& reply, std::string_view what);
-    void reportFault(std::string_view subject, const BusReply& reply, std::string_view what);
-
-    void stateChanged(const Modem& modem);
     void simChanged();
     void followParts(const Modem& modem);
     void partChanged(const std::string& path, const ModemParts::Part& part, const Dictionary* changed);
@@ -83,27 +56,15 @@ private:
     [[nodiscard]] std::string reasonFor(const std::vector<std::string>& paths) const;
     void reportLater();
     void report();
+    void cellsMeasured(const DictionaryRef& root);
     void send(std::uint32_t code, const DictionaryRef& root);
 
-    void call(const BusCall& call, std::function<void(const BusReply&)> answered);
-    /// Runs after the delay unless the session has ended.
-    void after(std::chrono::nanoseconds delay, std::function<void()> task);
-
-    MainQueue& _queue;
     const Clock& _clock;
     ModemFollower& _follower;
     Report _report;
-    std::string _path; ///< the modem's
-    std::string _name; ///< "modem 0", for messages
-    Query _cellQuery{"cells"};
-    Query _locationQuery{"place"};
-    CellAnswer _cells;
-    bool _awaitsPlace = false; ///< the cells wait for the place
-    bool _cellsDue = true;     ///< they are reported without a measurement too
-    Value _location;           ///< the last answer
-    std::string _locationReason;
-    bool _positionRuns = false; ///< the position is being polled
-    Value _state;               ///< the modem's at the last change
+    ModemCalls _calls;
+    CellPoller _cells;
+    Value _state; ///< the modem's at the last change
     Value _access;
     std::string _sim;                  ///< the active SIM's path; empty for none
     std::vector<std::string> _slots;   ///< the path of the SIM of each slot; empty for none
