@@ -35,7 +35,7 @@ constexpr ValueRow contextRows[] = {
     {kVoxContextInterface, {"Interface", computed, plainText()}},
     {kVoxContextDownlinkSpeed, {"Downlink Speed", computed, real("%.0f kbit/s")}, speed, bitsPerKilobit},
     {kVoxContextUplinkSpeed, {"Uplink Speed", computed, real("%.0f kbit/s")}, speed, bitsPerKilobit},
-    {kVoxContextStart, {"Connected Since (UTC)", computed, plainText()}},
+    {kVoxContextStart, {"Since (UTC)", computed, plainText()}},
 };
 constexpr ValueRow ipv4Rows[] = {
     {kVoxContextMethod, {"IPv4 Method", computed, text(addressMethods)}, known},

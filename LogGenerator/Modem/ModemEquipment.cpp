@@ -24,7 +24,7 @@ constexpr ValueRow modemRows[] = {
     {kVoxModemRevision, {"Revision", computed, plainText()}},
     {kVoxModemHardware, {"Hardware Revision", computed, plainText()}},
     {kVoxModemEquipment,
-     {"Equipment Identity",
+     {"Equipment ID",
       computed,
       plainText(),
       {.identity = Identity::Equipment, .clause = "3GPP TS 23.003 6.2"}}},

@@ -13,7 +13,8 @@ from . import pcapng, random_records
 from .damage import damaged
 
 RECORDINGS = Path(__file__).parents[1] / "Recordings"
-TECHNOLOGIES = {"gsm": "Ostrel_GSM", "lte": "Ostrel_LTE", "utran": "Ostrel_UTRAN2", "c2k": "Ostrel_CDMA", "ifx": "IFX"}
+TECHNOLOGIES = {"gsm": "Ostrel_GSM", "lte": "Ostrel_LTE", "utran": "Ostrel_UTRAN2", "c2k": "Ostrel_CDMA", "ifx": "IFX",
+                "modem": "Modem"}
 # A drive of that length has every log code of its technology.
 SAMPLES = 20_000
 
@@ -59,6 +60,8 @@ def random_messages(drives: Drives, count: int, directory: Path, seed: int = 1) 
         path = directory / f"random-{scenario}.pcapng"
         if scenario == "ifx":
             pcapng.write(path, technology, random_records.displays(count, seed))
+        elif scenario == "modem":
+            pcapng.write(path, technology, random_records.live_modem(count, seed, own, codes))
         else:
             cells = {"gsm": "GSM", "lte": "LTE", "utran": "UTRAN"}.get(scenario, "CDMA")
             pcapng.write(path, technology, random_records.records(cells, count, seed, own, codes))

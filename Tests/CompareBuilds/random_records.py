@@ -2,9 +2,12 @@
 # SPDX-License-Identifier: MIT
 """Messages of every log code with random lengths and contents, the same for the same seed."""
 
+import contextlib
+import plistlib
 import random
 import struct
 from collections.abc import Iterable, Iterator
+from typing import Any
 
 from . import property_lists
 
@@ -96,6 +99,51 @@ def records(technology: str, count: int, seed: int, samples: list[bytes], codes:
             message = bytes([chance.randrange(2, 255)]) + message[1:]
         if not is_sim_file(message) or shape >= 0.45:
             yield message
+
+
+def altered(value: Any, others: list[Any], chance: random.Random) -> Any:
+    """A value of a live modem's message, with other values of the same drive, or any, here and there."""
+    shape = chance.random()
+    if shape < 0.03:
+        return chance.choice(others)
+    if shape < 0.06:
+        return property_lists.anything(chance)
+    if isinstance(value, dict):
+        return {key: altered(each, others, chance) for key, each in value.items() if chance.random() < 0.97}
+    if isinstance(value, list):
+        return [altered(each, others, chance) for each in value for _ in range(chance.choice([0, 1, 1, 1, 1, 1, 2]))]
+    return value
+
+
+def leaves(value: Any) -> Iterator[Any]:
+    children = value.values() if isinstance(value, dict) else value if isinstance(value, list) else None
+    if children is None:
+        yield value
+    else:
+        for child in children:
+            yield from leaves(child)
+
+
+def live_modem(count: int, seed: int, samples: list[bytes], codes: list[int]) -> Iterator[bytes]:
+    """A drive's accounts with values taken out, exchanged and repeated, and records of every other kind. None of
+    them ends the program."""
+    chance = random.Random(f"Modem {seed}")
+    accounts: list[tuple[int, Any]] = []
+    for sample in samples:
+        with contextlib.suppress(ValueError, plistlib.InvalidFileException):
+            accounts.append((struct.unpack("<H", sample[3:5])[0], plistlib.loads(sample[HEADER:])))
+    others = [leaf for _, account in accounts[:500] for leaf in leaves(account)]
+    for _ in range(count):
+        shape = chance.random()
+        if shape < 0.7:
+            code, account = chance.choice(accounts)
+            yield record(code, property_lists.serialized(chance, altered(account, others, chance)), chance, EXTRA)
+        elif shape < 0.9:
+            yield changed(chance.choice(samples), chance)
+        else:
+            code = chance.choice([*codes, *range(10)])
+            kind = chance.choice([BASEBAND, EXTRA])
+            yield record(code, contents(chance.randint(*chance.choice(LENGTHS)), chance), chance, kind)
 
 
 def displays(count: int, seed: int) -> Iterator[bytes]:

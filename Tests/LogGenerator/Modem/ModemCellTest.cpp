@@ -43,7 +43,7 @@ TEST_F(ModemCellTest, LTE) {
                                 {"TimingAdvance", 5}})),
               "{Radio Technology 'LTE', PLMN '310-005', MCC '310', MNC '005', Cell Identity '27439876', "
               "eNB ID '107187', Sector '4', TAC '4660', PCI '257', EARFCN '1600', Bands '3', "
-              "Overlapping Bands '9', Downlink '1845.0000 MHz', Uplink '1750.0000 MHz', "
+              "Overlapping Bands '9', Downlink '1845.000 MHz', Uplink '1750.000 MHz', "
               "Bandwidth '20.0 MHz', RSRP '-95.3 dBm', RSRQ '-11.5 dB', SINR '12.2 dB', RSSI '-65.0 dBm', "
               "Path Loss '110.0 dB', Timing Advance '5', Distance '390 m'}");
 }
@@ -66,7 +66,7 @@ TEST_F(ModemCellTest, NR) {
                                 {"TimingAdvance", 3846}})),
               "{Radio Technology 'NR', PLMN '001-01', MCC '001', MNC '01', Cell Identity '4886718379', "
               "gNB ID (if of 24 bits) '1193046', Sector (if of 12 bits) '1963', TAC '1193046', PCI '1007', "
-              "NR-ARFCN '630000', Bands 'n77, n78', Downlink '3450.0000 MHz', "
+              "NR-ARFCN '630000', Bands 'n77, n78', Downlink '3450.000 MHz', "
               "RSRP '-101.0 dBm', RSRQ '-10.5 dB', SINR '-3.0 dB', Timing Advance '3846'}");
 }
 
@@ -84,7 +84,7 @@ TEST_F(ModemCellTest, UMTS) {
                                 {"PathLoss", 120.5}})),
               "{Radio Technology 'UMTS', PLMN '262-01', MCC '262', MNC '01', Cell Identity '12951986', "
               "RNC ID '197', Cell of RNC '41394', LAC '65533', PSC '511', UARFCN '10700', Bands 'I', "
-              "Downlink '2140.0000 MHz', Uplink '1950.0000 MHz', RSCP '-88.0 dBm', Ec-No '-7.5 dB', "
+              "Downlink '2140.000 MHz', Uplink '1950.000 MHz', RSCP '-88.0 dBm', Ec-No '-7.5 dB', "
               "Path Loss '120.5 dB'}");
 }
 
@@ -111,8 +111,8 @@ TEST_F(ModemCellTest, GSM) {
                           {"RSSI", -71},
                           {"TimingAdvance", 3}})),
         "{Radio Technology 'GSM', PLMN '262-99', MCC '262', MNC '99', Cell Identity '65535', LAC '257', "
-        "BSIC '59', NCC-BCC '7-3', ARFCN '62', Bands 'P-GSM 900', Downlink '947.4000 MHz', "
-        "Uplink '902.4000 MHz', RXLEV '-71.0 dBm', Timing Advance '3', Distance '1660 m'}");
+        "BSIC '59', NCC-BCC '7-3', ARFCN '62', Bands 'P-GSM 900', Downlink '947.400 MHz', "
+        "Uplink '902.400 MHz', RXLEV '-71.0 dBm', Timing Advance '3', Distance '1660 m'}");
 }
 
 TEST_F(ModemCellTest, CDMA2000) {
@@ -146,7 +146,7 @@ TEST_F(ModemCellTest, KnownByIdentityAlone) {
 TEST_F(ModemCellTest, AFrequencyWithoutAChannel) {
     EXPECT_EQ(
         servingCell(cell("NR", "Serving", {{"DownlinkFrequency", 3450120}, {"UplinkFrequency", 3450120}})),
-        "{Radio Technology 'NR', Downlink '3450.1200 MHz', Uplink '3450.1200 MHz'}");
+        "{Radio Technology 'NR', Downlink '3450.120 MHz', Uplink '3450.120 MHz'}");
 }
 
 struct UnknownCase {

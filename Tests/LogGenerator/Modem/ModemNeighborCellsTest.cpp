@@ -23,10 +23,10 @@ TEST_F(ModemNeighborCellsTest, OfAnyTechnologyByFallingLevel) {
               })}),
         "{State '5 cells', Cells ["
         "{Radio Technology 'GSM', BSIC '8', NCC-BCC '1-0', ARFCN '975', Bands 'E-GSM 900', "
-        "Downlink '925.2000 MHz', Uplink '880.2000 MHz', RXLEV '-85.0 dBm'}, "
+        "Downlink '925.200 MHz', Uplink '880.200 MHz', RXLEV '-85.0 dBm'}, "
         "{Radio Technology 'UMTS', PSC '4', RSCP '-90.0 dBm', Ec-No '-12.0 dB'}, "
-        "{Radio Technology 'LTE', PCI '1', EARFCN '1300', Bands '3', Downlink '1815.0000 MHz', "
-        "Uplink '1720.0000 MHz', RSRP '-110.0 dBm', RSRQ '-14.0 dB'}, "
+        "{Radio Technology 'LTE', PCI '1', EARFCN '1300', Bands '3', Downlink '1815.000 MHz', "
+        "Uplink '1720.000 MHz', RSRP '-110.0 dBm', RSRQ '-14.0 dB'}, "
         "{Radio Technology 'NR', PCI '3', RSRP '-110.0 dBm', SINR '1.0 dB'}, "
         "{Radio Technology 'CDMA2000', PN Offset '7', Pilot Strength '-9.0 dB'}]}");
 }

@@ -138,7 +138,7 @@ TEST_F(ModemSectionsTest, PacketDataContexts) {
         "{State 'Registered', Contexts [{Bearer '1', Connected 'Yes', Suspended 'No', Type 'Default', "
         "Profile '3', APN 'internet', IP Family 'IPv4v6', Interface 'wwan0', "
         "Downlink Speed '150000 kbit/s', Uplink Speed '50000 kbit/s', "
-        "Connected Since (UTC) '2001-09-09 01:46:40', IPv4 Method 'Static', IPv4 Address '10.0.0.2', "
+        "Since (UTC) '2001-09-09 01:46:40', IPv4 Method 'Static', IPv4 Address '10.0.0.2', "
         "IPv4 Prefix '30', IPv4 Gateway '10.0.0.1', IPv4 DNS '9.9.9.9, 1.1.1.1', "
         "IPv4 MTU '1430 bytes', IPv6 Method 'DHCP', IPv6 Address '2001:db8::2', IPv6 Prefix '64'}, "
         "{Bearer '2', Connected 'No', Error 'operation not allowed', IP Family 'IPv4, IPv6'}]}");
@@ -218,7 +218,7 @@ TEST_F(ModemSectionsTest, Modem) {
                       {"kVoxModemCapabilities", 0x4C},
                       {"kVoxModemManagerVersion", "1.20.4"}}),
               "{State 'Failed: SIM error', Manufacturer 'Maker', Model 'M1', Revision '1.0', "
-              "Hardware Revision 'A', Equipment Identity '004400152020000', Modem State 'Failed', "
+              "Hardware Revision 'A', Equipment ID '004400152020000', Modem State 'Failed', "
               "Failure 'SIM error', Lock 'SIM PUK', Power State 'On', "
               "Capabilities 'GSM/UMTS, LTE, 5G NR', Drivers 'qmi_wwan, option', Plugin 'generic', "
               "Primary Port 'cdc-wdm0', Device '/sys/devices/x', Index '0', ModemManager Version '1.20.4'}");
@@ -231,7 +231,7 @@ TEST_F(ModemSectionsTest, Position) {
                       {"kVoxPositionAltitude", 12},
                       {"kVoxPositionTime", "101500.00"}}),
               "{State 'Registered', Latitude '-33.500000\u00B0', Longitude '151.250000\u00B0', "
-              "Altitude '12.0 m', Time (UTC) '101500.00'}");
+              "Altitude '12.0 m', Time (UTC) '10:15:00.00'}");
     EXPECT_EQ(nodeOf("Position", LiveModemCode::position, {{"kVoxPositionLatitude", 90.5}}),
               "{State 'No position'}");
 }
