@@ -13,7 +13,8 @@ from . import pcapng, random_records
 from .damage import damaged
 
 RECORDINGS = Path(__file__).parents[1] / "Recordings"
-TECHNOLOGIES = {"gsm": "Ostrel_GSM", "lte": "Ostrel_LTE", "utran": "Ostrel_UTRAN2", "c2k": "Ostrel_CDMA", "ifx": "IFX"}
+TECHNOLOGIES = {"gsm": "Ostrel_GSM", "lte": "Ostrel_LTE", "utran": "Ostrel_UTRAN2", "c2k": "Ostrel_CDMA", "ifx": "IFX",
+                "modem": "Modem"}
 # A drive of that length has every log code of its technology.
 SAMPLES = 20_000
 

@@ -12,7 +12,7 @@ import unittest
 from collections.abc import Callable
 from pathlib import Path
 
-from CompareBuilds import cases, differences, pcapng, random_records, running
+from CompareBuilds import cases, differences, inputs, pcapng, random_records, running
 from CompareBuilds.running import Case
 
 
@@ -94,6 +94,10 @@ class LeftOutTest(unittest.TestCase):
 
 
 class InputsTest(unittest.TestCase):
+    def test_every_recording_is_compared(self) -> None:
+        self.assertEqual({given.path.name for given in inputs.recordings()},
+                         {path.name for path in inputs.RECORDINGS.glob("*.pcapng")})
+
     def test_a_packet(self) -> None:
         # Time stamp 0x18765432_89ABCDEF, five bytes and three of padding.
         self.assertEqual(pcapng.packet(0x1876543289ABCDEF, b"abcde").hex(" ", 4),
