@@ -81,6 +81,8 @@ class LeftOutTest(unittest.TestCase):
     def test_addresses(self) -> None:
         self.assertEqual(running.ADDRESS.sub(b"ADDRESS", b"with 0x555f35bea760, code 0x51F4, 0x555f35bea7601"),
                          b"with ADDRESS, code 0x51F4, 0x555f35bea7601")
+        self.assertEqual(running.ADDRESS.sub(b"ADDRESS", b"of 0x5500012ac0, code 0xff0000"),
+                         b"of ADDRESS, code 0xff0000")
 
     def test_the_build_stamp_alone(self) -> None:
         report = bytes.fromhex("a100fd1f") + bytes(range(4, 161))
