@@ -15,8 +15,9 @@ from typing import IO
 CHUNK = 1 << 20
 TIME_LIMIT_S = 900
 
-# Where objects lie in memory differs from run to run; the log says it of a few. Log codes are shorter.
-ADDRESS = re.compile(rb"\b0x[0-9a-f]{12}\b")
+# Where objects lie in memory differs from run to run; the log says it of a few. Addresses have 12 digits, 10 in an
+# emulated arm64 program; log codes are shorter.
+ADDRESS = re.compile(rb"\b0x[0-9a-f]{10,12}\b")
 # The build stamp: 18 bytes at offset 63 of the version report that begins a DLF log (length 161, code 0x1FFD), and
 # 24 characters at character 84 of the same in a snapshot's base64. The time and the version beside it are compared:
 # a conversion takes its time from the recording.

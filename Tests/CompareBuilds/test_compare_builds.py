@@ -12,7 +12,7 @@ import unittest
 from collections.abc import Callable
 from pathlib import Path
 
-from CompareBuilds import cases, differences, pcapng, random_records, running
+from CompareBuilds import cases, differences, inputs, pcapng, random_records, running
 from CompareBuilds.running import Case
 
 
@@ -81,6 +81,8 @@ class LeftOutTest(unittest.TestCase):
     def test_addresses(self) -> None:
         self.assertEqual(running.ADDRESS.sub(b"ADDRESS", b"with 0x555f35bea760, code 0x51F4, 0x555f35bea7601"),
                          b"with ADDRESS, code 0x51F4, 0x555f35bea7601")
+        self.assertEqual(running.ADDRESS.sub(b"ADDRESS", b"of 0x5500012ac0, code 0xff0000"),
+                         b"of ADDRESS, code 0xff0000")
 
     def test_the_build_stamp_alone(self) -> None:
         report = bytes.fromhex("a100fd1f") + bytes(range(4, 161))
@@ -94,6 +96,10 @@ class LeftOutTest(unittest.TestCase):
 
 
 class InputsTest(unittest.TestCase):
+    def test_every_recording_is_compared(self) -> None:
+        self.assertEqual({given.path.name for given in inputs.recordings()},
+                         {path.name for path in inputs.RECORDINGS.glob("*.pcapng")})
+
     def test_a_packet(self) -> None:
         # Time stamp 0x18765432_89ABCDEF, five bytes and three of padding.
         self.assertEqual(pcapng.packet(0x1876543289ABCDEF, b"abcde").hex(" ", 4),
