@@ -14,6 +14,7 @@
 #include <gtest/gtest.h>
 
 #include <chrono>
+#include <cstdlib>
 #include <iomanip>
 #include <sstream>
 #include <string>
@@ -38,7 +39,11 @@ std::string shownValue(const Value& value) {
         return *flag ? "true" : "false";
     std::ostringstream words;
     if (const double* real = value.asReal()) {
-        words << std::setprecision(17) << *real;
+        int digits = 15;
+        do {
+            words.str({});
+            words << std::setprecision(digits) << *real;
+        } while (std::strtod(words.str().c_str(), nullptr) != *real && ++digits <= 17);
     } else if (const Date* date = value.asDate()) {
         words << (*date - from2001).count() << ".000 s since 2001-01-01";
     } else if (const Data* data = value.asData()) {
