@@ -98,6 +98,7 @@ FuzzCorpus sourceStringCorpus() {
         "scenario:utran,speed=1e3,seed=7",
         "scenario:c2k,seed=1",
         "scenario:ifx",
+        "scenario:modem,seed=2",
         "replay:drive.pcapng",
         "replay:a,b,loop,speed=4",
         "replay:/tmp/x.dlf,speed=max,loop",
@@ -105,6 +106,7 @@ FuzzCorpus sourceStringCorpus() {
         "replay:x.velmora,technology=Ostrel_LTE",
         "modemmanager",
         "modemmanager,modem=4294967295",
+        "modemmanager,modem=/sys/devices/x,sim=8900101000000000017",
     };
     constexpr std::string_view words[] = {"scenario:", "replay:", "gsm",    "lte",     "utran",
                                           "c2k",       "ifx",     ",seed=", ",speed=", ",loop",

@@ -27,7 +27,8 @@ TEST_P(VelmoraSelfTest, OpensEveryScreenOnTheServicesData) {
     end(*service);
 }
 
-INSTANTIATE_TEST_SUITE_P(Technologies, VelmoraSelfTest, testing::Values("gsm", "lte", "utran", "c2k", "ifx"),
+INSTANTIATE_TEST_SUITE_P(Technologies, VelmoraSelfTest,
+                         testing::Values("gsm", "lte", "utran", "c2k", "ifx", "modem"),
                          [](const auto& row) { return std::string(row.param); });
 
 class VelmoraSignalTest : public VelmoraProcessTest, public testing::WithParamInterface<int> {};

@@ -186,6 +186,8 @@ TEST(DissectorList, showsEachKindOfValueAndMarksErrors) {
         {"eight bytes have a sign", listOf("13 FFFFFFFFFFFFFFFE"), "-2", ""},
         {"a single", listOf("22 3FC00000"), "1.5", ""},
         {"a double", listOf("23 C004000000000000"), "-2.5", ""},
+        {"a double of few decimal digits", listOf("23 C053A66666666666"), "-78.6", ""},
+        {"a double of 17 digits", listOf("23 3FD3333333333334"), "0.30000000000000004", ""},
         {"a date", listOf("33 3FF8000000000000"), "1.500 s since 2001-01-01", ""},
         {"data", listOf("43 00FF7F"), "00ff7f", ""},
         {"text", listOf("53 616263"), "abc", ""},

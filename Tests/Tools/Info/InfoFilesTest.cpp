@@ -135,7 +135,7 @@ TEST_F(InfoFilesTest, JsonIsAnObjectForEachFile) {
 
 TEST_F(InfoFilesTest, JsonOfEveryRecordingAndFormKeepsToTheSchema) {
     std::vector<std::string> arguments = {"info", "--format", "json"};
-    for (const std::string name : {"gsm", "lte", "utran", "c2k", "ifx"}) {
+    for (const std::string name : {"gsm", "lte", "utran", "c2k", "ifx", "modem"}) {
         const std::string file = std::string(VELMORA_SOURCE_DIR "/Tests/Recordings/") + name + ".pcapng";
         arguments.push_back(file);
         for (const std::string form : {".velmora", ".dlf"}) {
@@ -150,7 +150,7 @@ TEST_F(InfoFilesTest, JsonOfEveryRecordingAndFormKeepsToTheSchema) {
         }
     }
     const std::string json = run(arguments);
-    EXPECT_EQ(check(json), "14\n");
+    EXPECT_EQ(check(json), "17\n");
     EXPECT_THAT(json, HasSubstr(R"("text": "a <b> \"c\"")"));
 }
 
