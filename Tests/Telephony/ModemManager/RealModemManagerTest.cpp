@@ -1,6 +1,7 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
+#include "Telephony/ModemManager/Members/MemberTable.h"
 #include "Tests/Telephony/ModemManager/ModemManagerProcesses.h"
 
 #include <QDBusConnection>
@@ -8,11 +9,15 @@
 #include <QDBusPendingCall>
 #include <QString>
 #include <QStringList>
+#include <QXmlStreamReader>
 
 #include <gmock/gmock.h>
 #include <unistd.h>
 
+#include <algorithm>
 #include <filesystem>
+#include <map>
+#include <set>
 
 /// The telephony service with ModemManager itself, whose modem is a responder of AT commands.
 
@@ -60,6 +65,31 @@ protected:
         }
         QDBusConnection::disconnectFromBus(name);
         return done;
+    }
+
+    /// The properties of an object, by interface, as its introspection lists them.
+    [[nodiscard]] std::map<std::string, std::set<std::string>> properties(const QString& path) const {
+        const QString name = QStringLiteral("velmora-test-introspection");
+        std::map<std::string, std::set<std::string>> all;
+        {
+            auto session = QDBusConnection::connectToBus(QString::fromStdString(bus.address()), name);
+            const QDBusMessage reply = session.call(QDBusMessage::createMethodCall(
+                "org.freedesktop.ModemManager1", "/org/freedesktop/ModemManager1" + path,
+                "org.freedesktop.DBus.Introspectable", "Introspect"));
+            QXmlStreamReader reader(reply.arguments().value(0).toString());
+            std::string interface;
+            while (!reader.atEnd()) {
+                if (reader.readNext() != QXmlStreamReader::StartElement)
+                    continue;
+                const std::string named = reader.attributes().value("name").toString().toStdString();
+                if (reader.name() == QStringLiteral("interface"))
+                    interface = named;
+                else if (reader.name() == QStringLiteral("property"))
+                    all[interface].insert(named);
+            }
+        }
+        QDBusConnection::disconnectFromBus(name);
+        return all;
     }
 
     std::unique_ptr<TestProcess> responder;
@@ -129,6 +159,40 @@ TEST_F(RealModemManagerTest, showsTheModemAsItIsEnabledRegistersAndConnects) {
     EXPECT_TRUE(eventually([this] {
         return mmcli({"-m", "any", "--signal-get"}).find("refresh rate: 0 seconds") != std::string::npos;
     }));
+}
+
+bool isInTable(MemberOf of, const std::string& property) {
+    const auto rows = memberTable();
+    return std::any_of(rows.begin(), rows.end(),
+                       [&](const MemberRow& row) { return row.of == of && row.member == property; });
+}
+
+/// The properties that are dictionaries, whose members have rows of their own.
+const std::set<std::string> dictionaries{"Cdma", "Evdo",       "Gsm",   "Umts",      "Lte",
+                                         "Nr5g", "Properties", "Stats", "Ip4Config", "Ip6Config"};
+
+TEST_F(RealModemManagerTest, everyPropertyHasItsRowInTheMemberTable) {
+    startModem();
+    ASSERT_TRUE(eventually([this] { return mmcli({"-L"}).find("/Modem/0") != std::string::npos; }));
+    ASSERT_THAT(mmcli({"-m", "any", "--enable"}), HasSubstr("successfully enabled the modem"));
+    ASSERT_THAT(mmcli({"-m", "any", "--simple-connect=apn=internet.test"}),
+                HasSubstr("successfully connected the modem"));
+    auto all = properties("/Modem/0");
+    all.merge(properties("/SIM/0"));
+    all.merge(properties("/Bearer/0"));
+    const std::string prefix = "org.freedesktop.ModemManager1.";
+    for (const auto& [interface, of] :
+         std::map<std::string, MemberOf>{{"Modem", MemberOf::Modem},
+                                         {"Modem.Modem3gpp", MemberOf::Modem3gpp},
+                                         {"Modem.Location", MemberOf::Location},
+                                         {"Modem.Signal", MemberOf::Signal},
+                                         {"Sim", MemberOf::SIM},
+                                         {"Bearer", MemberOf::Bearer}}) {
+        EXPECT_GE(all[prefix + interface].size(), 5U) << interface;
+        for (const std::string& property : all[prefix + interface])
+            EXPECT_TRUE(dictionaries.contains(property) || isInTable(of, property))
+                << interface << '.' << property;
+    }
 }
 
 } // namespace
