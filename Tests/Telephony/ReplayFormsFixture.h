@@ -48,7 +48,7 @@ protected:
     };
 
     ReplayFormsFixture() {
-        for (const char* name : {"LTE", "Ostrel_GSM", "Ostrel_UTRAN", "C2KTemplate"}) {
+        for (const char* name : {"LTE", "Ostrel_GSM", "Ostrel_UTRAN", "C2KTemplate", "Modem"}) {
             const auto root = readPropertyList(shippedResource(std::string(name) + ".plist").bytes());
             resources.put(name, "plist", *root);
         }

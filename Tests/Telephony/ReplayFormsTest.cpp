@@ -184,7 +184,7 @@ TEST_P(ReplayFormsTest, dlfLogOfManyBuffers) {
 }
 
 INSTANTIATE_TEST_SUITE_P(OfEachTechnology, ReplayFormsTest,
-                         ::testing::Values("gsm", "lte", "utran", "c2k", "ifx"));
+                         ::testing::Values("gsm", "lte", "utran", "c2k", "ifx", "modem"));
 
 } // namespace
 } // namespace velmora

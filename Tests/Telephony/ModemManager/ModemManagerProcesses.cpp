@@ -44,6 +44,10 @@ std::unique_ptr<TestProcess> ModemManagerProcesses::start(const std::string& pro
     return std::make_unique<TestProcess>(program, std::move(arguments), directory.path());
 }
 
+std::unique_ptr<TestProcess> ModemManagerProcesses::startTool(std::vector<std::string> arguments) const {
+    return start(VELMORA_BUILD_DIR "/velmora-log", std::move(arguments));
+}
+
 void ModemManagerProcesses::serve(const std::string& source, const std::string& line) {
     service = start(VELMORA_BUILD_DIR "/velmora-telephonyd", {"--source", source, "--log-level", "5"});
     ASSERT_TRUE(eventually([&] { return service->standardError().find(line + '\n') != std::string::npos; }))

@@ -26,6 +26,8 @@ protected:
 
     [[nodiscard]] std::unique_ptr<TestProcess> start(const std::string& program,
                                                      std::vector<std::string> arguments) const;
+    /// Starts velmora-log.
+    [[nodiscard]] std::unique_ptr<TestProcess> startTool(std::vector<std::string> arguments) const;
     /// Starts the telephony service with that source and waits until it has said `line`.
     void serve(const std::string& source, const std::string& line);
     /// What is at the end of these keys in the client's latest message of that code.

@@ -160,7 +160,7 @@ protected:
     /// Records the whole drive.
     void record() {
         serve("modemmanager", "<4>modemmanager: no modem is there");
-        auto recorder = start(VELMORA_BUILD_DIR "/velmora-log", {"record", recording});
+        auto recorder = startTool({"record", recording});
         TestClient client(directory.path(), "com.velmora.test.client");
         ASSERT_TRUE(client.connect());
         // The first message is written: the recorder listens. It is flushed within half a second.
@@ -187,13 +187,13 @@ protected:
     }
 
     [[nodiscard]] std::string run(std::vector<std::string> arguments) const {
-        const auto tool = start(VELMORA_BUILD_DIR "/velmora-log", std::move(arguments));
+        const auto tool = startTool(std::move(arguments));
         EXPECT_EQ(tool->exitStatus(), 0) << tool->standardError();
         return tool->standardOutput();
     }
     /// The output, whatever the status: of a file that is still being written.
     [[nodiscard]] std::string output(std::vector<std::string> arguments) const {
-        const auto tool = start(VELMORA_BUILD_DIR "/velmora-log", std::move(arguments));
+        const auto tool = startTool(std::move(arguments));
         static_cast<void>(tool->exitStatus());
         return tool->standardOutput();
     }

@@ -44,7 +44,7 @@ std::string inOrder(const Value& value) {
 class LateDisplayTest : public testing::TestWithParam<const char*> {
 protected:
     LateDisplayTest() {
-        for (const char* name : {"Ostrel_GSM", "LTE", "Ostrel_UTRAN", "C2KTemplate"})
+        for (const char* name : {"Ostrel_GSM", "LTE", "Ostrel_UTRAN", "C2KTemplate", "Modem"})
             resources.put(name, "plist", shippedResource(std::string(name) + ".plist"));
     }
 
@@ -81,7 +81,7 @@ TEST_P(LateDisplayTest, AskingForItAtEveryMessageChangesNothing) {
     }
 }
 
-INSTANTIATE_TEST_SUITE_P(Drives, LateDisplayTest, testing::Values("gsm", "c2k", "lte", "utran"),
+INSTANTIATE_TEST_SUITE_P(Drives, LateDisplayTest, testing::Values("gsm", "c2k", "lte", "utran", "modem"),
                          [](const auto& drive) { return std::string(drive.param); });
 
 } // namespace
