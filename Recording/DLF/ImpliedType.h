@@ -3,6 +3,7 @@
 
 #pragma once
 
+#include "LogMessages/LiveModem.h"
 #include "LogMessages/LogMessage.h"
 
 #include <cstdint>
@@ -10,10 +11,10 @@
 namespace velmora {
 
 /// The type of a record that a DLF log keeps without its type byte: that of the extra stream for the codes 0
-/// to 2, which the baseband's stream does not have, else the baseband's.
+/// to 7, which the baseband's stream does not have, else the baseband's.
 [[nodiscard]] constexpr std::uint8_t impliedType(std::uint16_t code) {
-    return LogMessage::firstExtraCode + code <= ExtraCode::packetDataContexts ? LogMessage::extraType
-                                                                              : LogMessage::basebandType;
+    return LogMessage::firstExtraCode + code <= LiveModemCode::position ? LogMessage::extraType
+                                                                        : LogMessage::basebandType;
 }
 
 } // namespace velmora
