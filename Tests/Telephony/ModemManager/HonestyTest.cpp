@@ -3,9 +3,16 @@
 
 #include "Tests/Telephony/ModemManager/PartsFixture.h"
 
+#include "LogGenerator/LogGenerator.h"
 #include "PropertyLists/PropertyList.h"
+#include "Tests/Support/FakeResources.h"
+#include "Tests/Support/ShippedResources.h"
 
-/// After a loss no old value is in any message, one poll later.
+#include <algorithm>
+#include <iterator>
+#include <map>
+
+/// After a loss no old value is in any message or on the screen, one poll later.
 
 namespace velmora {
 namespace {
@@ -13,7 +20,29 @@ namespace {
 using namespace std::chrono_literals;
 
 /// Each value of the first modem's holds one of these, which no other modem, cell or SIM has.
-const std::string marks[] = {"111", "Elder"};
+const std::string marks[] = {"111", "11.1", "Elder"};
+
+/// The sections that show a message.
+const std::map<std::uint32_t, std::vector<const char*>> sections = {
+    {LiveModemCode::sim, {"SIM", "SIM Slots"}},
+    {LiveModemCode::cells, {"Serving Cell", "Secondary Cell", "Neighbor Cells"}},
+    {LiveModemCode::contexts, {"Packet Data Contexts"}},
+    {LiveModemCode::registration, {"Registration"}},
+    {LiveModemCode::link, {"Link"}},
+    {LiveModemCode::traffic, {"Traffic"}},
+    {LiveModemCode::modem, {"Modem"}},
+    {LiveModemCode::position, {"Position"}},
+};
+
+bool hasMark(const std::string& text) {
+    return std::any_of(std::begin(marks), std::end(marks),
+                       [&](const std::string& mark) { return text.find(mark) != std::string::npos; });
+}
+
+std::string textOf(const Value& value) {
+    const auto list = writeXMLPropertyList(value);
+    return list ? *list : std::string();
+}
 
 class HonestyTest : public PartsFixture {
 protected:
@@ -55,14 +84,29 @@ protected:
     }
 
     /// What the latest message of the code says, as text.
-    std::string text(std::uint32_t code) const {
-        const auto list = writeXMLPropertyList(latest(code));
-        return list ? *list : std::string();
+    std::string text(std::uint32_t code) const { return textOf(latest(code)); }
+    /// What the sections that show it make of all messages so far, as text.
+    std::string shown(std::uint32_t code) const {
+        FakeResources resources;
+        resources.put("Modem", "plist", shippedResource("Modem.plist"));
+        const auto decoder = LogGenerator::generatorFromTechnology(kVoxLogChannelTechnology_Modem, clock);
+        Dictionary state;
+        for (const Data& message : sink.messages) {
+            decoder->updateState(state, message);
+            static_cast<void>(decoder->display(state));
+        }
+        std::string words;
+        const Dictionary* const display = state["Display"].asDictionary();
+        for (const char* const section : sections.at(code))
+            words += display ? textOf((*display)[section]) : std::string();
+        return words;
     }
     void expectNothingOld(std::initializer_list<std::uint32_t> codes) const {
-        for (const std::uint32_t code : codes)
-            for (const std::string& mark : marks)
-                EXPECT_EQ(text(code).find(mark), std::string::npos) << std::hex << code << ": " << text(code);
+        for (const std::uint32_t code : codes) {
+            EXPECT_FALSE(hasMark(text(code))) << std::hex << code << ": " << text(code);
+            EXPECT_FALSE(hasMark(shown(code))) << std::hex << code << ": " << shown(code);
+            EXPECT_NE(shown(code).find("<key>State</key>"), std::string::npos) << std::hex << code;
+        }
     }
     static constexpr std::initializer_list<std::uint32_t> all = {
         LiveModemCode::sim,  LiveModemCode::cells,   LiveModemCode::contexts, LiveModemCode::registration,
@@ -71,11 +115,8 @@ protected:
 
 TEST_F(HonestyTest, theMarksAreThere) {
     for (const std::uint32_t code : all) {
-        // The levels and the position are reals.
-        const bool isMarked = text(code).find("111") != std::string::npos ||
-                              text(code).find("Elder") != std::string::npos ||
-                              text(code).find("11.1") != std::string::npos;
-        EXPECT_TRUE(isMarked) << std::hex << code << ": " << text(code);
+        EXPECT_TRUE(hasMark(text(code))) << std::hex << code << ": " << text(code);
+        EXPECT_TRUE(hasMark(shown(code))) << std::hex << code << ": " << shown(code);
     }
 }
 
@@ -112,6 +153,7 @@ TEST_F(HonestyTest, theModemGoesToStandaloneNR) {
                                                                       {"kVoxCellMonitorNRARFCN", 431000},
                                                                       {"kVoxCellMonitorRSRP", -85.0}})}));
     EXPECT_TRUE(latest(LiveModemCode::link, {"kVoxLinkLTE"}).isNone());
+    expectNothingOld({LiveModemCode::cells, LiveModemCode::link});
 }
 
 TEST_F(HonestyTest, theModemIsUnplugged) {
@@ -119,6 +161,7 @@ TEST_F(HonestyTest, theModemIsUnplugged) {
     drain();
     for (const std::uint32_t code : all)
         EXPECT_EQ(latest(code), dictionary({{"kVoxModemPresence", number(ModemPresence::NoModem)}}));
+    expectNothingOld(all);
 }
 
 TEST_F(HonestyTest, anotherModemReplacesIt) {
