@@ -32,9 +32,9 @@ protected:
     virtual void describeShown(ContentVisitor& visitor) const = 0;
     /// The state of a section whose modem works. The default is that of the modem.
     [[nodiscard]] virtual std::string stateOf(const Dictionary& message) const;
-    /// Whether the section logs what is wrong with a message: of several that read a code, one does.
+    /// Whether the section logs errors of a message: of several that read a code, one does.
     [[nodiscard]] virtual bool reportsErrors() const { return true; }
-    /// Logs what is wrong with the contents of a message. The default logs nothing.
+    /// Logs the errors in the contents of a message. The default logs nothing.
     virtual void checkMessage(const Dictionary& message) const;
 
 private:

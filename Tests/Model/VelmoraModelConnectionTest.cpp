@@ -14,7 +14,7 @@ using testing::ElementsAre;
 using testing::IsEmpty;
 using Kind = ConnectionProblem::Kind;
 
-/// What the observer is told, and when.
+/// Which changes of the connection the observer gets, and when.
 class VelmoraModelConnectionTest : public ModelFixture {
 protected:
     void connectionChanged() override {

@@ -20,8 +20,8 @@ struct CarrierBand {
     std::optional<std::int32_t> uplink_kHz;
 };
 
-/// What a channel number tells of a carrier. The numbers of the standards are not unique: one can lie in
-/// several bands, at times with other frequencies in each. Allocates nothing.
+/// The bands and frequencies that a channel number means. The numbers of the standards are not unique: one
+/// can lie in several bands, at times with other frequencies in each. Allocates nothing.
 class Carrier {
 public:
     /// More than any number has, and than overlap with any.

@@ -15,7 +15,7 @@ struct Range {
     std::int32_t separation_kHz;
 };
 
-// E-GSM holds P-GSM, R-GSM holds E-GSM, and ER-GSM holds R-GSM: each is told of the numbers that it adds.
+// E-GSM holds P-GSM, R-GSM holds E-GSM, and ER-GSM holds R-GSM: each has a row for the numbers that it adds.
 constexpr Range ranges[] = {
     {"E-GSM 900", 0, 0, 890'000, 45'000},      {"P-GSM 900", 1, 124, 890'200, 45'000},
     {"GSM 850", 128, 251, 824'200, 45'000},    {"GSM 450", 259, 293, 450'600, 10'000},

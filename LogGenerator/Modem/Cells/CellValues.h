@@ -48,7 +48,7 @@ void showDownlink(const ReportedCell& cell, const CellRow& row, FieldVisitor& vi
 void showUplink(const ReportedCell& cell, const CellRow& row, FieldVisitor& visitor);
 
 void showTimingAdvance(const ReportedCell& cell, const CellRow& row, FieldVisitor& visitor);
-/// What the timing advance tells of the distance. Not of NR, where it depends on the subcarrier spacing.
+/// The distance that the timing advance stands for. Not of NR, where it depends on the subcarrier spacing.
 void showDistance(const ReportedCell& cell, const CellRow& row, FieldVisitor& visitor);
 
 } // namespace velmora::LiveModem
