@@ -26,11 +26,6 @@ public:
 
     /// The connection's current error, as far as the log shows it; empty for none.
     [[nodiscard]] const std::string& problem() const { return _problem; }
-    /// The cause of this attempt's failure, which has been found otherwise than by the log.
-    void setCause(const std::string& problem) {
-        setProblem(problem);
-        _attemptFailed = false;
-    }
     /// The connection is good now.
     void clearProblem() {
         _problem.clear();
