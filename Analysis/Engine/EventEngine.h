@@ -1,0 +1,45 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include "Analysis/Engine/Detector.h"
+#include "Analysis/Events/EventSink.h"
+#include "Analysis/MessageReport.h"
+#include "Analysis/Picture/RadioPicture.h"
+#include "LogGenerator/Observations/Catalogue.h"
+
+#include <memory>
+#include <optional>
+#include <vector>
+
+namespace velmora {
+
+/// Makes events of what the messages of one technology report: of a file, of several that follow each other,
+/// or live. Its memory does not grow with their number.
+class EventEngine {
+public:
+    /// With the detectors that are built in. Catalogue and sink must outlive it.
+    EventEngine(const Catalogue& catalogue, EventSink& sink);
+    EventEngine(const EventEngine&) = delete;
+    EventEngine& operator=(const EventEngine&) = delete;
+
+    /// Adds one that gets all further messages, after the earlier ones.
+    void add(std::unique_ptr<Detector> detector);
+
+    /// The next message.
+    void report(const MessageReport& report);
+    /// The input has ended.
+    void finish();
+
+    /// What is known after the latest message.
+    [[nodiscard]] const RadioPicture& picture() const { return _picture; }
+
+private:
+    RadioPicture _picture;
+    EventSink& _sink;
+    std::vector<std::unique_ptr<Detector>> _detectors;
+    std::optional<Time> _last;
+};
+
+} // namespace velmora
