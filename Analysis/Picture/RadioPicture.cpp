@@ -36,8 +36,8 @@ void RadioPicture::update(const MessageReport& report) {
     _change.reset();
     if (report.observed.damage != Damage::None)
         return;
-    gather(report);
     forgetOld(report.time);
+    gather(report);
     change(report);
     forgetWithdrawn(report.observed);
     keep(report);
