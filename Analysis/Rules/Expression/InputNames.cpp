@@ -97,6 +97,15 @@ Result<RuleInput> InputNames::named(std::string_view name) {
 }
 
 Result<RuleInput> InputNames::at(std::string_view path) const {
+    const auto found = _paths.find(path);
+    if (found != _paths.end())
+        return found->second;
+    if (_paths.size() == mostPaths)
+        return Failure{"got more than " + std::to_string(mostPaths) + " different paths"};
+    return _paths.emplace(path, find(path)).first->second;
+}
+
+Result<RuleInput> InputNames::find(std::string_view path) const {
     TypeSearch search;
     bool isOpen = false;
     bool isNode = false;

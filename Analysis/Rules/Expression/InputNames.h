@@ -7,8 +7,13 @@
 #include "LogGenerator/Observations/Catalogue.h"
 #include "Platform/Result.h"
 
+#include <cstddef>
+#include <functional>
+#include <map>
 #include <span>
+#include <string>
 #include <string_view>
+#include <utility>
 #include <vector>
 
 namespace velmora {
@@ -21,13 +26,18 @@ public:
 
     /// A role, "neighbour.detected", "radio.technology" or "radio.mode". The reason lists the nearest names.
     [[nodiscard]] static Result<RuleInput> named(std::string_view name);
-    /// A path of a display. The reason lists the nearest paths.
+    /// A path of a display. The reason lists the nearest paths. Of different ones at most `mostPaths`.
     [[nodiscard]] Result<RuleInput> at(std::string_view path) const;
 
     [[nodiscard]] std::span<const Catalogue* const> catalogues() const { return _catalogues; }
 
+    static constexpr std::size_t mostPaths = 1024;
+
 private:
+    [[nodiscard]] Result<RuleInput> find(std::string_view path) const;
+
     std::vector<const Catalogue*> _catalogues;
+    mutable std::map<std::string, Result<RuleInput>, std::less<>> _paths; ///< looked up already
 };
 
 /// Whether messages of the technology can report it.
