@@ -24,8 +24,8 @@ struct Rule;
 struct RuleFile {
     std::string name; ///< for messages: its path
     std::string text;
-    /// A rule replaces one of the same name of a lower layer: built-in rules, the user's, those given on the
-    /// command line. Within a layer the name is an error.
+    /// A rule replaces all of the same name of a lower layer: built-in rules, the user's, those given on the
+    /// command line. Within a layer rules of one name must be for different technologies.
     int layer = 0;
 };
 
