@@ -81,7 +81,8 @@ std::string RuleSet::insert(Rule rule) {
 std::vector<RuleSet::Summary> RuleSet::summaries() const {
     std::vector<Summary> all;
     for (const auto& rule : _rules)
-        all.push_back({rule->name, rule->severity, rule->text, rule->file, rule->lasts});
+        if (all.empty() || all.back().name != rule->name)
+            all.push_back({rule->name, rule->severity, rule->text, rule->file, rule->lasts});
     return all;
 }
 

@@ -55,7 +55,7 @@ public:
 
     /// The mistakes of all files, in the order in which they were added; empty where there are none.
     [[nodiscard]] const std::vector<RuleError>& errors() const { return _errors; }
-    /// By name.
+    /// By name; of several rules of one name that of the first.
     [[nodiscard]] std::vector<Summary> summaries() const;
     /// By name.
     [[nodiscard]] std::span<const std::shared_ptr<const Rule>> rules() const { return _rules; }

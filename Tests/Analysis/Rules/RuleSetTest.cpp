@@ -39,6 +39,13 @@ TEST_F(RuleSetTest, ARuleOfAHigherLayerReplacesThoseOfItsName) {
     EXPECT_THAT(texts(rules), ElementsAre("a 3", "b 4"));
 }
 
+TEST_F(RuleSetTest, RulesOfOneNameHaveOneSummary) {
+    rules.add({"built-in.toml",
+               rule("b", "1", "technology = \"GSM\"\n") + rule("b", "2", "technology = \"LTE\"\n"), 1});
+    EXPECT_EQ(rules.rules().size(), 2U);
+    EXPECT_THAT(texts(rules), ElementsAre("b 1"));
+}
+
 TEST_F(RuleSetTest, TheOrderOfFilesDoesNotMatter) {
     rules.add({"mine.toml", rule("b", "4"), 2});
     rules.add({"built-in.toml", rule("b", "1") + rule("a", "3"), 1});
