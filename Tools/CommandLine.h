@@ -10,6 +10,7 @@
 #include "Tools/Fields/FieldsOptions.h"
 #include "Tools/Info/InfoOptions.h"
 #include "Tools/Record/RecordOptions.h"
+#include "Tools/Rules/RulesOptions.h"
 #include "Tools/Watch/WatchOptions.h"
 
 #include <string>
@@ -30,7 +31,7 @@ struct CommandLine {
     bool verbose =
         false; ///< decoder lines as they arise, not summed up; those of objects made and destroyed too
     std::variant<Notice, DecodeOptions, WatchOptions, RecordOptions, ConvertOptions, InfoOptions,
-                 FieldsOptions>
+                 FieldsOptions, RulesOptions>
         command;
 };
 
