@@ -18,9 +18,10 @@ struct AnalysedInput {
     std::vector<std::string> files; ///< "-" is standard input
     std::string technology;         ///< overrides a file's, or chooses one of several; empty for the files'
     bool showsProgress = true;      ///< of long files, on standard error where that is a terminal
+    bool writesAsItGoes = false;    ///< the output is written to while files are read
     std::function<void(std::uint32_t input)> beginsFile = {}; ///< the next file, before its messages
     std::function<void()> beforeWaiting = {};                 ///< more is waited for, as of a pipe
-    std::function<bool()> isDone = [] { return false; };      ///< whether the rest need not be read
+    std::function<bool()> isDone = {};                        ///< whether the rest need not be read
     std::function<void()> cleanUp = {}; ///< before the program ends on a failure of a decoder
 };
 
