@@ -25,9 +25,9 @@ std::string usageError(const CLI::App& app, const CLI::ParseError& error) {
         return error.what();
     const std::vector<std::string> rest = app.remaining();
     if (rest.empty())
-        return "no command, wanted decode, watch, record, convert, info or fields";
+        return "no command, wanted decode, watch, record, convert, info, fields or events";
     return "got " + rest.front() +
-           ", wanted one of the commands decode, watch, record, convert, info and fields";
+           ", wanted one of the commands decode, watch, record, convert, info, fields and events";
 }
 
 } // namespace
@@ -55,7 +55,7 @@ CommandLine parseCommandLine(int count, const char* const* arguments) {
     app.add_flag("-v,--verbose", line.verbose,
                  "Write each log line of a decoder as it arises, not their sum at the end, and those that "
                  "report its start and end");
-    app.footer("Exit status: 0 done, 1 the input was bad, 2 usage.\n\n"
+    app.footer("Exit status: 0 done, 1 the input was bad, 2 usage, 3 see events --fail-on.\n\n"
                "Examples:\n"
                "  velmora-log watch\n"
                "  velmora-log record drive.pcapng\n"
@@ -68,12 +68,14 @@ CommandLine parseCommandLine(int count, const char* const* arguments) {
     ConvertOptions convert;
     InfoOptions info;
     FieldsOptions fields;
+    EventsOptions events;
     const CLI::App* decodeCommand = addDecode(app, decode);
     const CLI::App* watchCommand = addWatch(app, watch);
     const CLI::App* recordCommand = addRecord(app, record);
     const CLI::App* convertCommand = addConvert(app, convert);
     const CLI::App* infoCommand = addInfo(app, info);
-    addFields(app, fields);
+    const CLI::App* fieldsCommand = addFields(app, fields);
+    addEvents(app, events);
 
     try {
         app.parse(count, arguments);
@@ -98,8 +100,10 @@ CommandLine parseCommandLine(int count, const char* const* arguments) {
         line.command = convert;
     else if (infoCommand->parsed())
         line.command = info;
-    else
+    else if (fieldsCommand->parsed())
         line.command = fields;
+    else
+        line.command = events;
     return line;
 }
 

@@ -1,0 +1,17 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include "Tools/Events/EventsOptions.h"
+
+namespace velmora {
+
+class DecoderLines;
+class Output;
+
+/// Lists the events of the files. Returns the exit status; where programs run for events, a signal ends the
+/// process once they are ended.
+[[nodiscard]] int listFileEvents(const EventsOptions& options, DecoderLines& lines, Output& output);
+
+} // namespace velmora
