@@ -1,0 +1,55 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
+#include "Tools/Rules/RuleFiles.h"
+
+#include "Platform/Linux/Files/FileResources.h"
+#include "Platform/Linux/Files/Files.h"
+#include "Platform/Linux/Files/FolderFiles.h"
+#include "Platform/TelephonyService.h"
+
+#include <limits>
+
+namespace velmora {
+
+namespace {
+
+constexpr int layerOfGivenFiles = std::numeric_limits<int>::max();
+
+void addFile(const std::string& path, int layer, RuleSet& rules) {
+    const Result<Data> content = readFile(path, RuleSet::mostBytes);
+    if (!content) {
+        rules.addError({path, 0, 0, content.reason()});
+        return;
+    }
+    const Bytes bytes = content->bytes();
+    rules.add({path, std::string(bytes.begin(), bytes.end()), layer});
+}
+
+} // namespace
+
+AllCatalogues::AllCatalogues() {
+    for (const std::string_view technology : voxTechnologies)
+        if (auto decoder = LogGenerator::generatorFromTechnology(technology, _clock)) {
+            _catalogues.push_back(&decoder->catalogue());
+            _decoders.push_back(std::move(decoder));
+        }
+}
+
+RuleSet loadOnlyRules(const AllCatalogues& catalogues, std::span<const std::string> files) {
+    RuleSet rules(catalogues.all());
+    for (const std::string& file : files)
+        addFile(file, layerOfGivenFiles, rules);
+    return rules;
+}
+
+RuleSet loadRules(const AllCatalogues& catalogues, std::span<const std::string> files) {
+    RuleSet rules(catalogues.all());
+    for (const FolderFile& each : filesInFolder(FileResources::standardDirectories(), "rules", "toml"))
+        addFile(each.path.string(), each.layer, rules);
+    for (const std::string& file : files)
+        addFile(file, layerOfGivenFiles, rules);
+    return rules;
+}
+
+} // namespace velmora
