@@ -14,7 +14,8 @@
 
 namespace velmora {
 
-EventListing::EventListing(const EventsOptions& options, Output& output, std::function<bool()> isInterrupted)
+EventListing::EventListing(const EventsOptions& options, const RuleSet& rules, Output& output,
+                           std::function<bool()> isInterrupted)
     : _options(options), _output(output), _names{options.files}, _writer(makeWriter()) {
     if (!options.program.empty()) {
         EventPrograms::Setup setup;
@@ -26,8 +27,10 @@ EventListing::EventListing(const EventsOptions& options, Output& output, std::fu
         _programs.emplace(std::move(setup), _names);
     }
     _list.emplace(options, *_writer, programs());
-    _feed.emplace(options.clock, [this](const Catalogue& catalogue) {
-        return std::make_unique<EventAnalysis>(catalogue, *_list);
+    _feed.emplace(options.clock, [this, &rules](const Catalogue& catalogue) {
+        auto analysis = std::make_unique<EventAnalysis>(catalogue, *_list);
+        analysis->add(makeRuleDetector(rules, catalogue));
+        return analysis;
     });
     _list->setFeed(*_feed);
     _writer->begin();

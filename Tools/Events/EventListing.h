@@ -3,6 +3,7 @@
 
 #pragma once
 
+#include "Analysis/Rules/RuleSet.h"
 #include "Tools/Analysed/AnalysisFeed.h"
 #include "Tools/Events/EventList.h"
 #include "Tools/Events/EventWriter.h"
@@ -19,8 +20,9 @@ namespace velmora {
 /// The listing of events from messages to lines and programs. Main thread only.
 class EventListing {
 public:
-    /// `isInterrupted`: whether waiting for programs is to end. Options and output must outlive it.
-    EventListing(const EventsOptions& options, Output& output, std::function<bool()> isInterrupted);
+    /// `isInterrupted`: whether waiting for programs is to end. Options, rules and output must outlive it.
+    EventListing(const EventsOptions& options, const RuleSet& rules, Output& output,
+                 std::function<bool()> isInterrupted);
     EventListing(const EventListing&) = delete;
     EventListing& operator=(const EventListing&) = delete;
 

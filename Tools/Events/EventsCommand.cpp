@@ -5,19 +5,45 @@
 
 #include "Tools/Events/FileEvents.h"
 #include "Tools/Events/LiveEvents.h"
+#include "Tools/ExitStatus.h"
 #include "Tools/Output.h"
+#include "Tools/Report.h"
+#include "Tools/Rules/RuleFiles.h"
 #include "Tools/ServiceClient.h"
+
+#include <algorithm>
+#include <string>
+#include <vector>
 
 namespace velmora {
 
+namespace {
+
+/// Reports the mistakes of rules. Returns whether those that were asked for have none: one among the user's
+/// own must not make the command useless.
+bool reportErrors(const RuleSet& rules, const std::vector<std::string>& given) {
+    bool good = true;
+    for (const RuleError& error : rules.errors()) {
+        report(error.message());
+        good = good && std::find(given.begin(), given.end(), error.file) == given.end();
+    }
+    return good;
+}
+
+} // namespace
+
 int runEvents(const EventsOptions& given, DecoderLines& lines, Output& output) {
     EventsOptions options = given;
-    if (options.files.empty()) {
-        options.isLive = true;
-        ServiceClient client;
-        return LiveEvents(options, lines, client, output).run();
-    }
-    return listFileEvents(options, lines, output);
+    const AllCatalogues catalogues;
+    const RuleSet rules = options.usesStandardRules ? loadRules(catalogues, options.rules)
+                                                    : loadOnlyRules(catalogues, options.rules);
+    if (!reportErrors(rules, options.rules))
+        return ExitStatus::BadInput;
+    if (!options.files.empty())
+        return listFileEvents(options, rules, lines, output);
+    options.isLive = true;
+    ServiceClient client;
+    return LiveEvents(options, rules, lines, client, output).run();
 }
 
 } // namespace velmora

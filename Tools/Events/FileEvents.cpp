@@ -42,11 +42,11 @@ private:
 
 } // namespace
 
-int listFileEvents(const EventsOptions& options, DecoderLines& lines, Output& output) {
+int listFileEvents(const EventsOptions& options, const RuleSet& rules, DecoderLines& lines, Output& output) {
     std::unique_ptr<ProgramSignals> signals;
     if (!options.program.empty())
         signals = std::make_unique<ProgramSignals>();
-    EventListing listing(options, output, [] { return ProgramSignals::hasSignal(); });
+    EventListing listing(options, rules, output, [] { return ProgramSignals::hasSignal(); });
     AnalysedInput input;
     input.files = options.files;
     input.technology = options.technology;

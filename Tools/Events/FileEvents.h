@@ -3,6 +3,7 @@
 
 #pragma once
 
+#include "Analysis/Rules/RuleSet.h"
 #include "Tools/Events/EventsOptions.h"
 
 namespace velmora {
@@ -12,6 +13,7 @@ class Output;
 
 /// Lists the events of the files. Returns the exit status; where programs run for events, a signal ends the
 /// process once they are ended.
-[[nodiscard]] int listFileEvents(const EventsOptions& options, DecoderLines& lines, Output& output);
+[[nodiscard]] int listFileEvents(const EventsOptions& options, const RuleSet& rules, DecoderLines& lines,
+                                 Output& output);
 
 } // namespace velmora

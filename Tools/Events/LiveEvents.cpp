@@ -30,10 +30,10 @@ std::chrono::nanoseconds nanosecondsOf(double seconds) {
 
 } // namespace
 
-LiveEvents::LiveEvents(const EventsOptions& options, DecoderLines& lines, ServiceClient& client,
-                       Output& output)
+LiveEvents::LiveEvents(const EventsOptions& options, const RuleSet& rules, DecoderLines& lines,
+                       ServiceClient& client, Output& output)
     : _options(options), _lines(lines), _client(client), _output(output),
-      _listing(options, output, [] { return SignalWatcher::hasSignal(); }),
+      _listing(options, rules, output, [] { return SignalWatcher::hasSignal(); }),
       _log(lines, [this](const std::string& problem) { reportProblem(problem); }) {
     RecordingModel::Events events;
     events.connecting = [this] {

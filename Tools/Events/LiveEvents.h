@@ -3,6 +3,7 @@
 
 #pragma once
 
+#include "Analysis/Rules/RuleSet.h"
 #include "Tools/Events/EventListing.h"
 #include "Tools/Events/EventsOptions.h"
 #include "Tools/Log/DecoderLines.h"
@@ -23,7 +24,8 @@ namespace velmora {
 class LiveEvents {
 public:
     /// All must outlive it.
-    LiveEvents(const EventsOptions& options, DecoderLines& lines, ServiceClient& client, Output& output);
+    LiveEvents(const EventsOptions& options, const RuleSet& rules, DecoderLines& lines, ServiceClient& client,
+               Output& output);
 
     /// Runs the client's event loop. Returns the exit status.
     int run();
