@@ -3,16 +3,21 @@
 
 #include "Tools/Events/EventsCommand.h"
 
+#include "Platform/PrintableText.h"
 #include "Tools/Events/FileEvents.h"
+#include "Tools/Events/KindNames.h"
 #include "Tools/Events/LiveEvents.h"
 #include "Tools/ExitStatus.h"
+#include "Tools/Log/DecoderLog.h"
 #include "Tools/Output.h"
 #include "Tools/Report.h"
 #include "Tools/Rules/RuleFiles.h"
 #include "Tools/ServiceClient.h"
 
 #include <algorithm>
+#include <optional>
 #include <string>
+#include <utility>
 #include <vector>
 
 namespace velmora {
@@ -34,11 +39,17 @@ bool reportErrors(const RuleSet& rules, const std::vector<std::string>& given) {
 
 int runEvents(const EventsOptions& given, DecoderLines& lines, Output& output) {
     EventsOptions options = given;
+    std::optional<DecoderLog> log(std::in_place, lines); // of the decoders whose catalogues are made
     const AllCatalogues catalogues;
+    log.reset();
     const RuleSet rules = options.usesStandardRules ? loadRules(catalogues, options.rules)
                                                     : loadOnlyRules(catalogues, options.rules);
     if (!reportErrors(rules, options.rules))
         return ExitStatus::BadInput;
+    if (const auto problem = unknownKind(options.selection.kinds, kindNames(rules))) {
+        report("--kind: " + printable(*problem));
+        return ExitStatus::Usage;
+    }
     if (!options.files.empty())
         return listFileEvents(options, rules, lines, output);
     options.isLive = true;
