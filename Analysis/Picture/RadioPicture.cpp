@@ -95,6 +95,7 @@ void RadioPicture::gatherRow(const Observation& observation, RadioSideState& sid
 void RadioPicture::forgetCell(RadioSide side) {
     _sides[side].readings.forgetServing();
     _sides[side].isReported = false;
+    _sides[side].before.reset(), _sides[side].since.reset();
     _sides[commonSide].readings.forgetServing(); // its network and area
 }
 
@@ -152,7 +153,10 @@ void RadioPicture::change(const MessageReport& report) {
                                     isModeKnown ? old.modeBefore : side.mode,
                                     isModeKnown ? old.wasMovedByNetwork : side.isMovedByNetwork,
                                     numberOf(old.readings.find(Role::ServingLevel)),
-                                    old.message};
+                                    old.message,
+                                    old.before,
+                                    old.since,
+                                    old.firstOfCell};
             forgetCell(before);
             _neighbours.forgetAll();
             if (isOtherSide)
@@ -160,6 +164,11 @@ void RadioPicture::change(const MessageReport& report) {
         }
         if (isOtherSide && _change && side.modeBefore == side.mode)
             side.setMode({}, false); // of an earlier time on this technology
+        if (_change && !side.since) {
+            side.before = _change->from;
+            side.since = report.time;
+            side.firstOfCell = report.message;
+        }
         if (!_table.isHybrid) {
             _current = i;
             _technology = side.found.technology;
@@ -251,6 +260,7 @@ void RadioPicture::clear() {
         each.readings.forgetAll();
         each.setMode({}, false);
         each.isReported = false;
+        each.before.reset(), each.since.reset();
     }
     _neighbours.forgetAll();
     _strongest.forgetAll();

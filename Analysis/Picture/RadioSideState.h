@@ -21,7 +21,10 @@ struct RadioSideState {
     bool isReported = false; ///< whether anything is known of a serving cell
     Time reported{};         ///< when a message last reported anything of it
     Time modeReported{};
-    MessageNumber message; ///< that did
+    std::optional<CellIdentity> before; ///< the serving cell before this one
+    std::optional<Time> since;          ///< when this one became it; only where a change was seen
+    MessageNumber firstOfCell;          ///< the message that reported the change
+    MessageNumber message;              ///< that did
 
     // Of the current message:
     std::optional<RadioMode> modeBefore;

@@ -22,9 +22,23 @@ constexpr NeighbourRow neighbours[] = {
     {"/Connected Mode/Detected Cells", NeighbourPart::DetectedCell},
 };
 
+// Where it is registered the SIM knows, and no other record does.
+constexpr StoredAreaRow storedAreas[] = {{"location", "/SIM Info/EF-LOCI"}};
+
+constexpr std::string_view contextLists[] = {"/Packet Data/PDP Context Info"};
+constexpr std::string_view addresses[] = {"PDP Address"};
+constexpr std::string_view sims[] = {"/SIM Info/EF-ICCID"};
+
 } // namespace
 
 constinit const TechnologyTable technologies::ostrelLTE{
-    .name = "Ostrel_LTE", .technologies = leaves, .evidence = evidence, .neighbours = neighbours};
+    .name = "Ostrel_LTE",
+    .technologies = leaves,
+    .evidence = evidence,
+    .neighbours = neighbours,
+    .detectors = {.storedAreas = storedAreas,
+                  .contexts = {.lists = contextLists, .key = "Context ID", .addresses = addresses},
+                  .sims = sims,
+                  .modeMachine = "RRC"}};
 
 } // namespace velmora
