@@ -58,14 +58,18 @@ public:
     /// By name.
     [[nodiscard]] std::vector<Summary> summaries() const;
     /// By name.
-    [[nodiscard]] std::vector<std::shared_ptr<const Rule>> rules() const;
+    [[nodiscard]] std::span<const std::shared_ptr<const Rule>> rules() const { return _rules; }
+    [[nodiscard]] std::span<const Catalogue* const> catalogues() const { return _catalogues; }
 
     static constexpr std::size_t mostRules = 4096;
     static constexpr std::size_t mostBytes = std::size_t{1} << 20; ///< of a file
 
 private:
+    /// Why the rule is not added; empty where it is, or where one of a higher layer replaces it.
+    std::string insert(Rule rule);
+
     std::vector<const Catalogue*> _catalogues;
-    std::vector<std::shared_ptr<const Rule>> _rules;
+    std::vector<std::shared_ptr<const Rule>> _rules; ///< by name
     std::vector<RuleError> _errors;
 };
 
