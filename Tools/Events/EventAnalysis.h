@@ -17,6 +17,9 @@ public:
     void add(std::unique_ptr<Detector> detector) { _engine.add(std::move(detector)); }
 
     void report(const MessageReport& report) override { _engine.report(report); }
+    void reportUndecoded(const UndecodedReport& report) override;
+    void reportLoss(const InputLoss& loss) override { _engine.damaged(loss.at, loss.reason); }
+    void interrupt() override { _engine.interrupt(); }
     void finish() override { _engine.finish(); }
 
 private:

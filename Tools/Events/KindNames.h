@@ -7,7 +7,6 @@
 
 #include <optional>
 #include <string>
-#include <string_view>
 #include <vector>
 
 namespace velmora {
@@ -18,9 +17,5 @@ namespace velmora {
 /// What is wrong with the names of kinds, with the nearest ones; absent where each is one.
 [[nodiscard]] std::optional<std::string> unknownKind(const std::vector<std::string>& given,
                                                      const std::vector<std::string>& known);
-
-/// How many characters have to be added, removed, replaced or exchanged with the next one to make one text
-/// of the other.
-[[nodiscard]] std::size_t editDistance(std::string_view one, std::string_view other);
 
 } // namespace velmora

@@ -145,7 +145,8 @@ void LiveEvents::loseService() {
         return;
     _gone = true;
     report(std::string(serviceTitle) + " is gone; waiting for it");
-    _listing.feed().reportLoss({{0, _messages + 1}, "the connection was interrupted"});
+    const DecoderLog log(_lines);
+    _listing.feed().interrupt();
 }
 
 /// At the start. Afterwards a lost service is reported as such, whatever the reason.
