@@ -84,7 +84,15 @@ void ContextsDetector::read(const Observation& observation) {
     }
 }
 
-bool ContextsDetector::readList(const ObservedMessage& message) {
+bool ContextsDetector::hasList(const ObservedMessage& message) const {
+    const auto isOne = [this](const ObservedList& list) {
+        return std::any_of(_table.lists.begin(), _table.lists.end(),
+                           [&list](std::string_view path) { return isAt(*list.list, path); });
+    };
+    return _table.isInEveryMessage || std::any_of(message.lists.begin(), message.lists.end(), isOne);
+}
+
+void ContextsDetector::readList(const ObservedMessage& message) {
     _count = 0;
     for (const Observation& each : message.observations)
         read(each);
@@ -93,16 +101,12 @@ bool ContextsDetector::readList(const ObservedMessage& message) {
             std::swap(_new[i], _new[--_count]);
         else
             ++i;
-    return _table.isInEveryMessage ||
-           std::any_of(message.lists.begin(), message.lists.end(), [this](const ObservedList& list) {
-               return std::any_of(_table.lists.begin(), _table.lists.end(),
-                                  [&list](std::string_view path) { return isAt(*list.list, path); });
-           });
 }
 
 void ContextsDetector::report(const MessageReport& report, const RadioPicture& picture, EventSink& sink) {
-    if (_table.lists.empty() || !readList(report.observed))
+    if (!hasList(report.observed))
         return;
+    readList(report.observed);
     if (_isKnown) {
         compare(report, picture, sink);
         return;

@@ -37,7 +37,8 @@ private:
         MessageNumber message; ///< that reported it first
     };
 
-    [[nodiscard]] bool readList(const ObservedMessage& message);
+    [[nodiscard]] bool hasList(const ObservedMessage& message) const;
+    void readList(const ObservedMessage& message);
     void read(const Observation& observation);
     [[nodiscard]] Context& at(std::uint32_t row);
     void compare(const MessageReport& report, const RadioPicture& picture, EventSink& sink);

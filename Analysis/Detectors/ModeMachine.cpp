@@ -10,9 +10,13 @@ namespace velmora {
 
 void ModeMachineDetector::report(const MessageReport& report, const RadioPicture& picture, EventSink& sink) {
     const std::optional<RadioMode> mode = picture.mode();
+    if (!mode) {
+        _since.reset(); // it may have been another one in between
+        return;
+    }
     if (mode == _mode)
         return;
-    if (mode && _mode) {
+    if (_mode) {
         Event event = newEvent(EventKind::RadioState, report, picture);
         addChange(event, std::string(nameOf(*_mode)), std::string(nameOf(*mode)));
         event.text.insert(0, std::string(_name) + ": ");
@@ -22,8 +26,6 @@ void ModeMachineDetector::report(const MessageReport& report, const RadioPicture
         addEvidence(event, _message);
         sink.happened(event);
         _since = report.time;
-    } else {
-        _since.reset();
     }
     _mode = mode;
     _message = report.message;

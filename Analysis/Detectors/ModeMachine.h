@@ -23,7 +23,7 @@ public:
 
 private:
     std::string_view _name;
-    std::optional<RadioMode> _mode;
+    std::optional<RadioMode> _mode; ///< the latest known one
     std::optional<Time> _since;
     MessageNumber _message;
 };

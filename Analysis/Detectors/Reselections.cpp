@@ -10,6 +10,7 @@
 #include <array>
 #include <cmath>
 #include <cstdio>
+#include <utility>
 
 namespace velmora {
 
@@ -39,13 +40,18 @@ bool areComparable(const Neighbour& neighbour, const CellIdentity& serving) {
 
 void ReselectionsDetector::report(const MessageReport& report, const RadioPicture& picture, EventSink& sink) {
     if (picture.servingChange()) {
+        _early.reset();
         judge(report, picture, sink);
         _seen.clear();
-    } else if (!picture.neighbours().empty()) {
-        compare(report, picture);
-    } else {
-        _seen.clear();
     }
+    if (_early)
+        confirm(report, picture, sink);
+    if (picture.servingChange())
+        return;
+    if (picture.neighbours().empty())
+        _seen.clear();
+    else
+        compare(report, picture);
 }
 
 void ReselectionsDetector::compare(const MessageReport& report, const RadioPicture& picture) {
@@ -75,6 +81,25 @@ void ReselectionsDetector::compare(const MessageReport& report, const RadioPictu
     std::swap(_seen, _next);
 }
 
+void ReselectionsDetector::confirm(const MessageReport& report, const RadioPicture& picture,
+                                   EventSink& sink) {
+    const Time changed = _early->event.time;
+    const Reading* const level = picture.find(Role::ServingLevel);
+    for (const Neighbour& each : picture.neighbours()) {
+        if (!level || level->time < changed || each.time < changed || !each.level_dBm ||
+            areSameCell(identityOf(each), _early->from) != true)
+            continue;
+        if (*each.level_dBm >= level->number) {
+            addEvidence(_early->event, each.message);
+            sink.happened(_early->event);
+        }
+        _early.reset();
+        return;
+    }
+    if (report.time - changed > oldest)
+        _early.reset();
+}
+
 void ReselectionsDetector::judge(const MessageReport& report, const RadioPicture& picture, EventSink& sink) {
     const ServingChange& change = *picture.servingChange();
     if (change.isMovedByNetwork != false || change.from.technology != change.to.technology)
@@ -99,7 +124,10 @@ void ReselectionsDetector::judge(const MessageReport& report, const RadioPicture
             addEvidence(event, each.firstBetter);
         }
         addEvidence(event, each.cell.message);
-        sink.happened(event);
+        if (isLate)
+            sink.happened(event);
+        else
+            _early = Early{std::move(event), change.from};
         return;
     }
 }

@@ -4,6 +4,7 @@
 #pragma once
 
 #include "Analysis/Engine/Detector.h"
+#include "Analysis/Picture/CellIdentity.h"
 #include "Analysis/Picture/Reading.h"
 
 #include <chrono>
@@ -25,7 +26,10 @@ public:
     static constexpr std::chrono::seconds oldest{2};
 
     void report(const MessageReport& report, const RadioPicture& picture, EventSink& sink) override;
-    void interrupt(Time, EventSink&) override { _seen.clear(); }
+    void interrupt(Time, EventSink&) override {
+        _seen.clear();
+        _early.reset();
+    }
 
 private:
     /// A neighbour of the serving cell that it can be compared with.
@@ -36,9 +40,20 @@ private:
         MessageNumber firstBetter;
     };
 
+    /// A reselection to a cell that had not been stronger; it was early if the one that the phone left is not
+    /// weaker afterwards either.
+    struct Early {
+        Event event;
+        CellIdentity from;
+    };
+
     void compare(const MessageReport& report, const RadioPicture& picture);
     void judge(const MessageReport& report, const RadioPicture& picture, EventSink& sink);
 
+    /// Passes on the early reselection, or forgets it, once both cells have been reported after it.
+    void confirm(const MessageReport& report, const RadioPicture& picture, EventSink& sink);
+
+    std::optional<Early> _early;
     std::vector<Seen> _seen;
     std::vector<Seen> _next; ///< storage for `compare`
 };

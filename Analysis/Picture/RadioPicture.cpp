@@ -36,10 +36,10 @@ void RadioPicture::update(const MessageReport& report) {
     _change.reset();
     if (report.observed.damage != Damage::None)
         return;
-    gather(report);
     forgetOld(report.time);
-    forgetWithdrawn(report.observed);
+    gather(report);
     change(report);
+    forgetWithdrawn(report.observed);
     keep(report);
     forgetReplaced(report);
     findCurrent();
@@ -68,6 +68,9 @@ void RadioPicture::gather(const MessageReport& report) {
             continue;
         RadioSideState& side = _sides[use.side];
         side.isServing = true;
+        if (use.role == Role::ServingArea && each.kind == ObservedKind::Number)
+            side.hasNoArea = std::find(_table.noAreas.begin(), _table.noAreas.end(),
+                                       static_cast<std::int64_t>(each.number)) != _table.noAreas.end();
         if (use.list && use.role == Role::ServingPhysicalCell)
             gatherRow(each, side);
         if (use.list)
@@ -133,6 +136,8 @@ CellIdentity RadioPicture::identity(RadioSide side) const {
 }
 
 bool RadioPicture::reportsCells(const RadioSideState& side) const {
+    if (side.hasNoArea)
+        return false;
     return !_table.hasCellInUseAlone || side.mode == RadioMode::Idle || side.mode == RadioMode::Connected;
 }
 
@@ -147,7 +152,8 @@ void RadioPicture::change(const MessageReport& report) {
         RadioSideState& old = _sides[before];
         const CellIdentity known = identity(before);
         if (known.isKnown() && areSameCell(known, side.found) == false) {
-            const bool isModeKnown = old.modeBefore.has_value();
+            // A message that reports both shows the mode in which the phone came to the cell.
+            const bool isModeKnown = old.modeBefore.has_value() && !side.isModeReported;
             _change = ServingChange{known,
                                     side.found,
                                     isModeKnown ? old.modeBefore : side.mode,
@@ -210,6 +216,7 @@ void RadioPicture::forgetReplaced(const MessageReport& report) {
 
 void RadioPicture::keepMode(const Observation& observation, const LeafUse& use, Time now) {
     RadioSideState& side = _sides[use.side];
+    side.isModeReported = true;
     if (use.evidence) {
         if (observation.kind != ObservedKind::Absent) {
             side.setMode(use.evidence->mode, use.evidence->mode == RadioMode::Connected);
@@ -233,6 +240,9 @@ void RadioPicture::keepMode(const Observation& observation, const LeafUse& use, 
 }
 
 void RadioPicture::findCurrent() {
+    for (RadioSide i = 0; i < radioSides; ++i)
+        if (_sides[i].isReported && !identity(i).isKnown())
+            forgetCell(i); // it was withdrawn
     if (_table.isHybrid) {
         const RadioSideState& data = _sides[sideOf(RadioTechnology::EVDO)];
         const RadioSideState& voice = _sides[sideOf(RadioTechnology::CDMA1x)];

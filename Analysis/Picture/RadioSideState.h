@@ -29,7 +29,9 @@ struct RadioSideState {
     // Of the current message:
     std::optional<RadioMode> modeBefore;
     std::optional<bool> wasMovedByNetwork;
-    bool isServing = false;              ///< whether it reports anything of a serving cell
+    bool isServing = false; ///< whether it reports anything of a serving cell
+    bool isModeReported = false;
+    bool hasNoArea = false;              ///< the area that it reports stands for none
     CellIdentity found;                  ///< the cell that it reports
     const CatalogueNode* list = nullptr; ///< of serving cells, of which it found the row
     std::uint32_t row = 0;
@@ -44,7 +46,7 @@ struct RadioSideState {
     void beginMessage() {
         modeBefore = mode;
         wasMovedByNetwork = isMovedByNetwork;
-        isServing = false;
+        isServing = isModeReported = hasNoArea = false;
         found.cell.reset(), found.channel.reset(), found.physicalCell.reset();
         list = nullptr;
     }

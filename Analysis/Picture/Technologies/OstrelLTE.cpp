@@ -22,6 +22,9 @@ constexpr NeighbourRow neighbours[] = {
     {"/Connected Mode/Detected Cells", NeighbourPart::DetectedCell},
 };
 
+// Reserved for when there is no valid tracking area identity (3GPP TS 23.003 19.4.2.3).
+constexpr std::int64_t noAreas[] = {0, 0xFFFE};
+
 // Where it is registered the SIM knows, and no other record does.
 constexpr StoredAreaRow storedAreas[] = {{"location", "/SIM Info/EF-LOCI"}};
 
@@ -36,6 +39,7 @@ constinit const TechnologyTable technologies::ostrelLTE{
     .technologies = leaves,
     .evidence = evidence,
     .neighbours = neighbours,
+    .noAreas = noAreas,
     .detectors = {.storedAreas = storedAreas,
                   .contexts = {.lists = contextLists, .key = "Context ID", .addresses = addresses},
                   .sims = sims,

@@ -76,6 +76,8 @@ struct TechnologyTable {
     bool isHybrid = false;
     /// Only idle and connected do records report a cell; else they have zeros in its place.
     bool hasCellInUseAlone = false;
+    /// Areas that stand for none: with one of them, a message reports no serving cell.
+    std::span<const std::int64_t> noAreas{};
     DetectorTable detectors{};
 };
 
