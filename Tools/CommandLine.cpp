@@ -7,7 +7,11 @@
 #include "Tools/CommandOptions.h"
 #include "Tools/ExitStatus.h"
 
+#include <cstddef>
+#include <functional>
+#include <memory>
 #include <sstream>
+#include <string>
 #include <vector>
 
 namespace velmora {
@@ -20,15 +24,48 @@ CLI::Validator validLogLevel() {
         "a number from 0 to 7");
 }
 
+/// The names of all commands, the last one after that word: "decode, watch and record".
+std::string commandNames(const CLI::App& app, const std::string& lastWord) {
+    const std::vector<const CLI::App*> commands = app.get_subcommands([](const CLI::App*) { return true; });
+    std::string names;
+    for (std::size_t i = 0; i < commands.size(); ++i) {
+        if (i > 0)
+            names += i + 1 < commands.size() ? ", " : ' ' + lastWord + ' ';
+        names += commands[i]->get_name();
+    }
+    return names;
+}
+
 std::string usageError(const CLI::App& app, const CLI::ParseError& error) {
     if (!app.get_subcommands().empty())
         return error.what();
     const std::vector<std::string> rest = app.remaining();
     if (rest.empty())
-        return "no command, wanted decode, watch, record, convert, info, fields or rules";
-    return "got " + rest.front() +
-           ", wanted one of the commands decode, watch, record, convert, info, fields and rules";
+        return "no command, wanted " + commandNames(app, "or");
+    return "got " + rest.front() + ", wanted one of the commands " + commandNames(app, "and");
 }
+
+/// The commands, with the options that parsing fills.
+class Commands {
+public:
+    template <class Options>
+    void add(CLI::App& app, CLI::App* (*addCommand)(CLI::App&, Options&)) {
+        const auto options = std::make_shared<Options>();
+        const CLI::App* const command = addCommand(app, *options);
+        _choices.emplace_back([command, options](CommandLine& line) {
+            if (command->parsed())
+                line.command = *options;
+        });
+    }
+    /// Puts the options of the command that was named into the line.
+    void choose(CommandLine& line) const {
+        for (const auto& each : _choices)
+            each(line);
+    }
+
+private:
+    std::vector<std::function<void(CommandLine&)>> _choices;
+};
 
 } // namespace
 
@@ -55,27 +92,22 @@ CommandLine parseCommandLine(int count, const char* const* arguments) {
     app.add_flag("-v,--verbose", line.verbose,
                  "Write each log line of a decoder as it arises, not their sum at the end, and those that "
                  "report its start and end");
-    app.footer("Exit status: 0 done, 1 the input was bad, 2 usage.\n\n"
+    app.footer("Exit status: 0 done, 1 the input was bad, 2 usage, 3 see events --fail-on.\n\n"
                "Examples:\n"
                "  velmora-log watch\n"
                "  velmora-log record drive.pcapng\n"
                "  velmora-log decode drive.pcapng\n"
                "  velmora-log COMMAND --help");
 
-    DecodeOptions decode;
-    WatchOptions watch;
-    RecordOptions record;
-    ConvertOptions convert;
-    InfoOptions info;
-    FieldsOptions fields;
-    RulesOptions rules;
-    const CLI::App* decodeCommand = addDecode(app, decode);
-    const CLI::App* watchCommand = addWatch(app, watch);
-    const CLI::App* recordCommand = addRecord(app, record);
-    const CLI::App* convertCommand = addConvert(app, convert);
-    const CLI::App* infoCommand = addInfo(app, info);
-    const CLI::App* fieldsCommand = addFields(app, fields);
-    addRules(app, rules);
+    Commands commands;
+    commands.add(app, addDecode);
+    commands.add(app, addWatch);
+    commands.add(app, addRecord);
+    commands.add(app, addConvert);
+    commands.add(app, addInfo);
+    commands.add(app, addFields);
+    commands.add(app, addEvents);
+    commands.add(app, addRules);
 
     try {
         app.parse(count, arguments);
@@ -90,20 +122,7 @@ CommandLine parseCommandLine(int count, const char* const* arguments) {
                                                    "\nvelmora-log --help tells more\n"};
         return line;
     }
-    if (decodeCommand->parsed())
-        line.command = decode;
-    else if (watchCommand->parsed())
-        line.command = watch;
-    else if (recordCommand->parsed())
-        line.command = record;
-    else if (convertCommand->parsed())
-        line.command = convert;
-    else if (infoCommand->parsed())
-        line.command = info;
-    else if (fieldsCommand->parsed())
-        line.command = fields;
-    else
-        line.command = rules;
+    commands.choose(line);
     return line;
 }
 

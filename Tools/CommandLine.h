@@ -7,6 +7,7 @@
 #include "Platform/SystemLog.h"
 #include "Tools/Convert/ConvertOptions.h"
 #include "Tools/Decode/DecodeOptions.h"
+#include "Tools/Events/EventsOptions.h"
 #include "Tools/Fields/FieldsOptions.h"
 #include "Tools/Info/InfoOptions.h"
 #include "Tools/Record/RecordOptions.h"
@@ -31,7 +32,7 @@ struct CommandLine {
     bool verbose =
         false; ///< decoder lines as they arise, not summed up; those of objects made and destroyed too
     std::variant<Notice, DecodeOptions, WatchOptions, RecordOptions, ConvertOptions, InfoOptions,
-                 FieldsOptions, RulesOptions>
+                 FieldsOptions, EventsOptions, RulesOptions>
         command;
 };
 

@@ -9,6 +9,7 @@
 #include "Tools/CommandLine.h"
 #include "Tools/Convert/ConvertCommand.h"
 #include "Tools/Decode/DecodeCommand.h"
+#include "Tools/Events/EventsCommand.h"
 #include "Tools/ExitStatus.h"
 #include "Tools/Fields/FieldsCommand.h"
 #include "Tools/Info/InfoCommand.h"
@@ -47,6 +48,8 @@ int run(const CommandLine& line, DecoderLines& lines, Output& output) {
         return runWatch(*watch, lines, output);
     if (const auto* record = std::get_if<RecordOptions>(&line.command))
         return runRecord(*record, lines);
+    if (const auto* events = std::get_if<EventsOptions>(&line.command))
+        return runEvents(*events, lines, output);
     const DecoderLog log(lines);
     if (const auto* info = std::get_if<InfoOptions>(&line.command))
         return runInfo(*info, output);

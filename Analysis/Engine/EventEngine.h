@@ -33,6 +33,8 @@ public:
     /// The reader of the input found damage, such as a record of the file that is not whole, before the
     /// message of that number. Messages may be missing: what was known is not valid any more.
     void damaged(MessageNumber message, std::string_view reason);
+    /// The connection that messages come by was lost: as damage, but no event.
+    void interrupt();
     /// The input has ended.
     void finish();
 
@@ -40,8 +42,6 @@ public:
     [[nodiscard]] const RadioPicture& picture() const { return _picture; }
 
 private:
-    void interrupt();
-
     RadioPicture _picture;
     EventSink& _sink;
     RecordingChecks _checks;

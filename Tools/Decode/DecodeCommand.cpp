@@ -3,11 +3,9 @@
 
 #include "Tools/Decode/DecodeCommand.h"
 
-#include "Platform/Linux/MachineClock.h"
 #include "Platform/PrintableText.h"
 #include "Recording/OpenMessages.h"
 #include "Tools/Decode/CSVRows.h"
-#include "Tools/Decode/DecodeProgress.h"
 #include "Tools/Decode/DecodeWriter.h"
 #include "Tools/Decode/Jobs/JobScheduler.h"
 #include "Tools/Decode/Paths/FileTechnologies.h"
@@ -15,21 +13,18 @@
 #include "Tools/Decode/Paths/PathCheck.h"
 #include "Tools/Decode/Samples/SampleRows.h"
 #include "Tools/Decode/Samples/WideRows.h"
+#include "Tools/Decode/ShownProgress.h"
 #include "Tools/ExitStatus.h"
 #include "Tools/Log/DecoderLog.h"
-#include "Tools/LogOverride.h"
 #include "Tools/Output.h"
 #include "Tools/Report.h"
 
 #include <algorithm>
-#include <cstdint>
 #include <memory>
 #include <optional>
 #include <string>
 #include <utility>
 #include <vector>
-
-#include <unistd.h>
 
 namespace velmora {
 
@@ -38,38 +33,6 @@ namespace {
 bool writesAsItGoes(const DecodeOptions& options) {
     return options.format == DecodeOptions::Format::JsonLines || options.format == DecodeOptions::Format::Csv;
 }
-
-/// The progress of one file on standard error, if that is a terminal and the file is long enough.
-class ShownProgress {
-public:
-    ShownProgress(const MessageReader& reader, const std::string& path, const DecodeOptions& options) {
-        if (::isatty(STDERR_FILENO) == 0)
-            return;
-        // Of a gzip'd file the offsets are no shares of its size.
-        if (reader.isCompressed())
-            return;
-        // On the same terminal it would mix with the lines.
-        if (writesAsItGoes(options) && ::isatty(STDOUT_FILENO) != 0)
-            return;
-        const std::optional<std::uint64_t> size = inputSize(path);
-        if (!size || *size <= DecodeProgress::smallestInput)
-            return;
-        _line.emplace();
-        _progress.emplace(*size, _clock, [this](std::string_view text) { _line->show(text); });
-    }
-
-    [[nodiscard]] DecodeProgress* get() { return _progress ? &*_progress : nullptr; }
-    /// Clears the line, before anything else is written there.
-    void clear() {
-        if (_line)
-            _line->clear();
-    }
-
-private:
-    MachineClock _clock;
-    std::optional<ProgressLine> _line;
-    std::optional<DecodeProgress> _progress;
-};
 
 /// Whether a file's technologies have to be known from the start.
 bool needsTechnologies(const DecodeOptions& options) {
@@ -133,7 +96,7 @@ bool decodeFile(std::size_t index, const DecodeOptions& options, bool showsProgr
     const bool isLive = !inputSize(path);
     writer = DecodeWriter::make(options, index, isLive, columns, output);
     if (showsProgress)
-        progress.emplace(**reader, path, options);
+        progress.emplace(**reader, path, writesAsItGoes(options));
     const auto clearProgress = [&progress] {
         if (progress)
             progress->clear();

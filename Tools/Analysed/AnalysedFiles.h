@@ -1,0 +1,33 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include "Tools/Analysed/AnalysisFeed.h"
+#include "Tools/Log/DecoderLines.h"
+
+#include <cstdint>
+#include <functional>
+#include <string>
+#include <vector>
+
+namespace velmora {
+
+/// What a command reads for an analysis, and how.
+struct AnalysedInput {
+    std::vector<std::string> files; ///< "-" is standard input
+    std::string technology;         ///< overrides a file's, or chooses one of several; empty for the files'
+    bool showsProgress = true;      ///< of long files, on standard error where that is a terminal
+    bool writesAsItGoes = false;    ///< the output is written to while files are read
+    std::function<void(std::uint32_t input)> beginsFile = {}; ///< the next file, before its messages
+    std::function<void()> beforeWaiting = {};                 ///< more is waited for, as of a pipe
+    std::function<bool()> whileWaiting = {};                  ///< as FileSource's hook
+    std::function<bool()> isDone = {};                        ///< whether the rest need not be read
+    std::function<void()> cleanUp = {}; ///< before the program ends on a failure of a decoder
+};
+
+/// Passes the messages of the files to the feed, one file after the other; `finish` is left to the caller.
+/// What could not be read or decoded is reported on standard error. Returns whether all of it was.
+[[nodiscard]] bool analyseFiles(const AnalysedInput& input, AnalysisFeed& feed, DecoderLines& lines);
+
+} // namespace velmora

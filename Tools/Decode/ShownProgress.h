@@ -1,0 +1,36 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include "Platform/Linux/MachineClock.h"
+#include "Recording/MessageReader.h"
+#include "Tools/Decode/DecodeProgress.h"
+#include "Tools/LogOverride.h"
+
+#include <optional>
+#include <string>
+
+namespace velmora {
+
+/// The progress of one file on standard error, if that is a terminal and the file is long enough.
+class ShownProgress {
+public:
+    /// `writesAsItGoes`: standard output is written to while the file is read.
+    ShownProgress(const MessageReader& reader, const std::string& path, bool writesAsItGoes);
+
+    /// Null where no progress is shown.
+    [[nodiscard]] DecodeProgress* get() { return _progress ? &*_progress : nullptr; }
+    /// Clears the line, before anything else is written there.
+    void clear() {
+        if (_line)
+            _line->clear();
+    }
+
+private:
+    MachineClock _clock;
+    std::optional<ProgressLine> _line;
+    std::optional<DecodeProgress> _progress;
+};
+
+} // namespace velmora
