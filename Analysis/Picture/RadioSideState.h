@@ -4,6 +4,7 @@
 #pragma once
 
 #include "Analysis/Picture/CellIdentity.h"
+#include "Analysis/Picture/LeafUse.h"
 #include "Analysis/Picture/RadioTechnology.h"
 #include "Analysis/Picture/RoleReadings.h"
 
@@ -43,6 +44,17 @@ struct RadioSideState {
         isMovedByNetwork = hasCell ? std::optional(byNetwork) : std::nullopt;
     }
 
+    /// What is known of the serving cell.
+    [[nodiscard]] CellIdentity identity() const;
+    /// Notes what the message reports of a serving cell.
+    void gather(const Observation& observation, const LeafUse& use, const TechnologyTable& table);
+    /// Takes the mode from an observation. Whether it is a new one without a serving cell.
+    bool takeMode(const Observation& observation, const LeafUse& use, Time now);
+    /// Whether what the message has in the place of a cell is one.
+    [[nodiscard]] bool reportsCell(const TechnologyTable& table) const;
+    void forgetCell();
+    void forgetAll();
+
     void beginMessage() {
         modeBefore = mode;
         wasMovedByNetwork = isMovedByNetwork;
@@ -50,6 +62,9 @@ struct RadioSideState {
         found.cell.reset(), found.channel.reset(), found.physicalCell.reset();
         list = nullptr;
     }
+
+private:
+    void gatherRow(const Observation& observation, const LeafUse& use);
 };
 
 } // namespace velmora
