@@ -3,8 +3,6 @@
 
 #include "Analysis/Picture/RadioPicture.h"
 
-#include "Analysis/Picture/PhysicalCell.h"
-
 #include <algorithm>
 
 namespace velmora {
@@ -36,10 +34,10 @@ void RadioPicture::update(const MessageReport& report) {
     _change.reset();
     if (report.observed.damage != Damage::None)
         return;
-    gather(report);
     forgetOld(report.time);
-    forgetWithdrawn(report.observed);
+    gather(report);
     change(report);
+    forgetWithdrawn(report.observed);
     keep(report);
     forgetReplaced(report);
     findCurrent();
@@ -58,44 +56,27 @@ void RadioPicture::gather(const MessageReport& report) {
             continue;
         if (use.part != NeighbourPart::None || isNeighbour(use.role))
             _neighbours.add(each, use, report, _table);
-        if (use.modes || use.evidence)
-            keepMode(each, use, report.time);
+        if ((use.modes || use.evidence) && _sides[use.side].takeMode(each, use, report.time))
+            forgetCells(use.side);
         if (each.kind == ObservedKind::Absent)
             continue;
         if (use.namesTechnology)
             _named = technologyOf(each.raw, _table);
         if (!isServing(use.role))
             continue;
-        RadioSideState& side = _sides[use.side];
-        side.isServing = true;
-        if (use.list && use.role == Role::ServingPhysicalCell)
-            gatherRow(each, side);
-        if (use.list)
-            continue;
-        if (use.role == Role::ServingCell)
-            side.found.cell = each.number;
-        else if (use.role == Role::ServingChannel)
-            side.found.channel = each.number;
-        else if (use.role == Role::ServingPhysicalCell)
-            side.found.physicalCell = physicalCellOf(each);
+        _sides[use.side].gather(each, use, _table);
     }
 }
 
-/// Of several serving cells, as an active set has them, the known one stays for as long as it is among them.
-void RadioPicture::gatherRow(const Observation& observation, RadioSideState& side) {
-    const Reading* const known = side.readings.find(Role::ServingPhysicalCell);
-    const bool isFirst = !side.list;
-    if (!isFirst && !(known && known->number == observation.number))
-        return;
-    side.list = useOf(*observation.leaf).list;
-    side.row = observation.rows.empty() ? 0 : observation.rows.back();
-    side.found.physicalCell = observation.number;
+void RadioPicture::forgetCell(RadioSide side) {
+    _sides[side].forgetCell();
+    _sides[commonSide].readings.forgetServing(); // its network and area
 }
 
-void RadioPicture::forgetCell(RadioSide side) {
-    _sides[side].readings.forgetServing();
-    _sides[side].isReported = false;
-    _sides[commonSide].readings.forgetServing(); // its network and area
+void RadioPicture::forgetCells(RadioSide side) {
+    for (RadioSide i = 0; i < radioSides; ++i)
+        if (i == side || side == commonSide)
+            forgetCell(i);
 }
 
 void RadioPicture::forgetOld(Time now) {
@@ -122,23 +103,16 @@ void RadioPicture::forgetWithdrawn(const ObservedMessage& message) {
 }
 
 CellIdentity RadioPicture::identity(RadioSide side) const {
-    const RadioSideState& state = _sides[side];
-    CellIdentity cell;
-    cell.technology = side == commonSide ? _technology : state.technology;
-    cell.cell = numberOf(state.readings.find(Role::ServingCell));
-    cell.channel = numberOf(state.readings.find(Role::ServingChannel));
-    cell.physicalCell = numberOf(state.readings.find(Role::ServingPhysicalCell));
+    CellIdentity cell = _sides[side].identity();
+    if (side == commonSide)
+        cell.technology = _technology;
     return cell;
-}
-
-bool RadioPicture::reportsCells(const RadioSideState& side) const {
-    return !_table.hasCellInUseAlone || side.mode == RadioMode::Idle || side.mode == RadioMode::Connected;
 }
 
 void RadioPicture::change(const MessageReport& report) {
     for (RadioSide i = 0; i < radioSides; ++i) {
         RadioSideState& side = _sides[i];
-        if (!side.found.isKnown() || !reportsCells(side))
+        if (!side.found.isKnown() || !side.reportsCell(_table))
             continue;
         side.found.technology = i == commonSide ? _named : side.technology;
         const bool isOtherSide = !_table.isHybrid && i != _current;
@@ -146,13 +120,17 @@ void RadioPicture::change(const MessageReport& report) {
         RadioSideState& old = _sides[before];
         const CellIdentity known = identity(before);
         if (known.isKnown() && areSameCell(known, side.found) == false) {
-            const bool isModeKnown = old.modeBefore.has_value();
+            // A message that reports both shows the mode in which the phone came to the cell.
+            const bool isModeKnown = old.modeBefore.has_value() && !side.isModeReported;
             _change = ServingChange{known,
                                     side.found,
                                     isModeKnown ? old.modeBefore : side.mode,
                                     isModeKnown ? old.wasMovedByNetwork : side.isMovedByNetwork,
                                     numberOf(old.readings.find(Role::ServingLevel)),
-                                    old.message};
+                                    old.message,
+                                    old.before,
+                                    old.since,
+                                    old.firstOfCell};
             forgetCell(before);
             _neighbours.forgetAll();
             if (isOtherSide)
@@ -160,6 +138,11 @@ void RadioPicture::change(const MessageReport& report) {
         }
         if (isOtherSide && _change && side.modeBefore == side.mode)
             side.setMode({}, false); // of an earlier time on this technology
+        if (_change && !side.since) {
+            side.before = _change->from;
+            side.since = report.time;
+            side.firstOfCell = report.message;
+        }
         if (!_table.isHybrid) {
             _current = i;
             _technology = side.found.technology;
@@ -182,7 +165,7 @@ void RadioPicture::keep(const MessageReport& report) {
         const std::uint32_t row = each.rows.empty() ? 0 : each.rows.back();
         if (each.kind == ObservedKind::Absent)
             side.readings.forgetLeaf(use.role, *each.leaf);
-        else if (isServing(use.role) && !reportsCells(side))
+        else if (isServing(use.role) && !side.reportsCell(_table))
             continue;
         else if (!use.list || row == (use.list == side.list ? side.row : 0))
             side.readings.keep(use.role, each, report, _text);
@@ -199,31 +182,10 @@ void RadioPicture::forgetReplaced(const MessageReport& report) {
         }
 }
 
-void RadioPicture::keepMode(const Observation& observation, const LeafUse& use, Time now) {
-    RadioSideState& side = _sides[use.side];
-    if (use.evidence) {
-        if (observation.kind != ObservedKind::Absent) {
-            side.setMode(use.evidence->mode, use.evidence->mode == RadioMode::Connected);
-            side.modeReported = now;
-        }
-        return;
-    }
-    const std::optional<RadioMode> before = side.mode;
-    side.setMode({}, false);
-    if (observation.kind != ObservedKind::Absent)
-        for (const ModeRow& row : use.modes->rows)
-            if (row.text.empty() ? observation.kind != ObservedKind::Text && row.raw == observation.raw
-                                 : row.text == observation.words)
-                side.setMode(row.mode, row.isMovedByNetwork);
-    if (side.mode == before || (side.mode != RadioMode::Off && side.mode != RadioMode::Searching))
-        return;
-    // There is no serving cell any more. One that this message reports is kept later.
-    for (RadioSide i = 0; i < radioSides; ++i)
-        if (i == use.side || use.side == commonSide)
-            forgetCell(i);
-}
-
 void RadioPicture::findCurrent() {
+    for (RadioSide i = 0; i < radioSides; ++i)
+        if (_sides[i].isReported && !identity(i).isKnown())
+            forgetCell(i); // it was withdrawn
     if (_table.isHybrid) {
         const RadioSideState& data = _sides[sideOf(RadioTechnology::EVDO)];
         const RadioSideState& voice = _sides[sideOf(RadioTechnology::CDMA1x)];
@@ -247,11 +209,8 @@ void RadioPicture::findStrongest() {
 }
 
 void RadioPicture::clear() {
-    for (RadioSideState& each : _sides) {
-        each.readings.forgetAll();
-        each.setMode({}, false);
-        each.isReported = false;
-    }
+    for (RadioSideState& each : _sides)
+        each.forgetAll();
     _neighbours.forgetAll();
     _strongest.forgetAll();
     _technology.reset();

@@ -62,16 +62,15 @@ private:
     const LeafUse& useOf(const CatalogueField& leaf);
     /// Notes what the message says of serving cells and neighbours, before any of it is kept.
     void gather(const MessageReport& report);
-    void gatherRow(const Observation& observation, RadioSideState& side);
     void forgetOld(Time now);
     void forgetWithdrawn(const ObservedMessage& message);
     void change(const MessageReport& report);
     void keep(const MessageReport& report);
-    void keepMode(const Observation& observation, const LeafUse& use, Time now);
     /// Forgets what was in a list of serving cells that the message replaced.
     void forgetReplaced(const MessageReport& report);
     void forgetCell(RadioSide side);
-    [[nodiscard]] bool reportsCells(const RadioSideState& side) const;
+    /// There is no serving cell any more: of that side or, where it is the common one, of any.
+    void forgetCells(RadioSide side);
     void findCurrent();
     void findStrongest();
     [[nodiscard]] RadioSideState& current() { return _sides[_current]; }

@@ -177,9 +177,10 @@ TEST(BaseTest, ArraysAreRewrittenInPlace) {
 TEST(BaseTest, MissingEntriesAreReported) {
     const CapturedLog log;
     const Data data = hex("05 06");
-    Probe::reportMissingEntries(CountedList(Record(data), 0, 1, 2), 0x7150);
+    const Probe probe("X", {1});
+    probe.reportMissingEntries(CountedList(Record(data), 0, 1, 2), 0x7150);
     EXPECT_THAT(log.lines(), ElementsAre());
-    Probe::reportMissingEntries(CountedList(Record(data), 0, 1, 3), 0x7150);
+    probe.reportMissingEntries(CountedList(Record(data), 0, 1, 3), 0x7150);
     EXPECT_THAT(log.lines(),
                 ElementsAre(CapturedLog::Line{LogPriority::Error, "Record 0x7150: 2 of 3 entries"}));
 }
