@@ -150,12 +150,12 @@ std::optional<Expression> RuleReader::readCondition(const TOMLNode& text, const 
         _errors.addInText(text, mistake->position, mistake->text);
         return std::nullopt;
     }
-    Expression& expression = std::get<Expression>(parsed);
-    if (expression.type().kind != ExpressionType::Kind::Truth) {
-        _errors.add(text.position, "got " + describe(expression.type()) + ", wanted a condition");
+    std::optional<Expression> expression(std::get<Expression>(std::move(parsed)));
+    if (expression->type().kind != ExpressionType::Kind::Truth) {
+        _errors.add(text.position, "got " + describe(expression->type()) + ", wanted a condition");
         return std::nullopt;
     }
-    return std::move(expression);
+    return expression;
 }
 
 } // namespace velmora
