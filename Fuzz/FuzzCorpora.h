@@ -25,5 +25,7 @@ namespace velmora {
 [[nodiscard]] FuzzCorpus snapshotCorpus();
 [[nodiscard]] FuzzCorpus gzipCorpus();
 [[nodiscard]] FuzzCorpus sourceStringCorpus();
+[[nodiscard]] FuzzCorpus ruleExpressionCorpus();
+[[nodiscard]] FuzzCorpus ruleFileCorpus();
 
 } // namespace velmora

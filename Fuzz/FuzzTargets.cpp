@@ -26,6 +26,8 @@ constexpr FuzzTargetKind kinds[] = {
     {"snapshot", makeSnapshotTarget, snapshotCorpus, 6144},
     {"gzip", makeGzipTarget, gzipCorpus, 512},
     {"source-string", makeSourceStringTarget, sourceStringCorpus, 128},
+    {"rule-expression", makeRuleExpressionTarget, ruleExpressionCorpus, 512},
+    {"rule-file", makeRuleFileTarget, ruleFileCorpus, 10240},
 };
 
 } // namespace

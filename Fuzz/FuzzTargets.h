@@ -48,5 +48,7 @@ struct FuzzTargetKind {
 [[nodiscard]] std::unique_ptr<FuzzTarget> makeSnapshotTarget();
 [[nodiscard]] std::unique_ptr<FuzzTarget> makeGzipTarget();
 [[nodiscard]] std::unique_ptr<FuzzTarget> makeSourceStringTarget();
+[[nodiscard]] std::unique_ptr<FuzzTarget> makeRuleExpressionTarget();
+[[nodiscard]] std::unique_ptr<FuzzTarget> makeRuleFileTarget();
 
 } // namespace velmora

@@ -3,16 +3,43 @@
 
 #include "Analysis/Rules/Files/TOMLReader.h"
 
+#include <stdexcept>
+#include <utility>
+
+namespace velmora {
+
+namespace {
+
+/// An assertion of the parser does not hold.
+class FailedAssertion : public std::logic_error {
+public:
+    FailedAssertion() : std::logic_error("an assertion of the parser") {}
+};
+
+[[noreturn]] void failAssertion() {
+    throw FailedAssertion();
+}
+
+constexpr void assertOfParser(bool holds) {
+    if (!holds)
+        failAssertion();
+}
+
+} // namespace
+
+} // namespace velmora
+
 // The parser's header is in this source alone, since it takes long to compile. Its own bound on depth is set
-// to ours.
+// to ours. It asserts what some malformed documents violate ("[[#"), which is to be a mistake of theirs and
+// not the end of the program, nor undefined as where assertions are turned off.
+#undef NDEBUG
+#define TOML_ASSERT(holds) velmora::assertOfParser(static_cast<bool>(holds))
 #define TOML_HEADER_ONLY 1
 #define TOML_EXCEPTIONS 1
 #define TOML_ENABLE_FORMATTERS 0
 #define TOML_MAX_NESTED_VALUES 16
 
 #include <toml++/toml.h>
-
-#include <utility>
 
 namespace velmora {
 
@@ -75,6 +102,8 @@ std::variant<TOMLNode, TOMLError> readTOML(std::string_view text) {
         return nodeOf(toml::parse(text));
     } catch (const toml::parse_error& error) {
         return TOMLError{positionOf(error.source()), asReason(error.description())};
+    } catch (const FailedAssertion&) {
+        return TOMLError{{}, "got a text that is no TOML document"};
     }
 }
 
