@@ -25,9 +25,9 @@ std::string usageError(const CLI::App& app, const CLI::ParseError& error) {
         return error.what();
     const std::vector<std::string> rest = app.remaining();
     if (rest.empty())
-        return "no command, wanted decode, watch, record, convert, info, fields or events";
+        return "no command, wanted decode, watch, record, convert, info, fields, events or rules";
     return "got " + rest.front() +
-           ", wanted one of the commands decode, watch, record, convert, info, fields and events";
+           ", wanted one of the commands decode, watch, record, convert, info, fields, events and rules";
 }
 
 } // namespace
@@ -69,13 +69,15 @@ CommandLine parseCommandLine(int count, const char* const* arguments) {
     InfoOptions info;
     FieldsOptions fields;
     EventsOptions events;
+    RulesOptions rules;
     const CLI::App* decodeCommand = addDecode(app, decode);
     const CLI::App* watchCommand = addWatch(app, watch);
     const CLI::App* recordCommand = addRecord(app, record);
     const CLI::App* convertCommand = addConvert(app, convert);
     const CLI::App* infoCommand = addInfo(app, info);
     const CLI::App* fieldsCommand = addFields(app, fields);
-    addEvents(app, events);
+    const CLI::App* eventsCommand = addEvents(app, events);
+    addRules(app, rules);
 
     try {
         app.parse(count, arguments);
@@ -102,8 +104,10 @@ CommandLine parseCommandLine(int count, const char* const* arguments) {
         line.command = info;
     else if (fieldsCommand->parsed())
         line.command = fields;
-    else
+    else if (eventsCommand->parsed())
         line.command = events;
+    else
+        line.command = rules;
     return line;
 }
 

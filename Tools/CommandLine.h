@@ -11,6 +11,7 @@
 #include "Tools/Fields/FieldsOptions.h"
 #include "Tools/Info/InfoOptions.h"
 #include "Tools/Record/RecordOptions.h"
+#include "Tools/Rules/RulesOptions.h"
 #include "Tools/Watch/WatchOptions.h"
 
 #include <string>
@@ -31,7 +32,7 @@ struct CommandLine {
     bool verbose =
         false; ///< decoder lines as they arise, not summed up; those of objects made and destroyed too
     std::variant<Notice, DecodeOptions, WatchOptions, RecordOptions, ConvertOptions, InfoOptions,
-                 FieldsOptions, EventsOptions>
+                 FieldsOptions, EventsOptions, RulesOptions>
         command;
 };
 

@@ -18,6 +18,7 @@
 #include "Tools/Output.h"
 #include "Tools/Record/RecordCommand.h"
 #include "Tools/Report.h"
+#include "Tools/Rules/RulesCommand.h"
 #include "Tools/Watch/WatchCommand.h"
 
 #include <csignal>
@@ -54,6 +55,8 @@ int run(const CommandLine& line, DecoderLines& lines, Output& output) {
         return runInfo(*info, output);
     if (const auto* fields = std::get_if<FieldsOptions>(&line.command))
         return runFields(*fields, output);
+    if (const auto* rules = std::get_if<RulesOptions>(&line.command))
+        return runRules(*rules, output);
     return runConvert(std::get<ConvertOptions>(line.command));
 }
 

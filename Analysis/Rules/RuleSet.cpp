@@ -12,6 +12,18 @@
 
 namespace velmora {
 
+namespace {
+
+/// Whether there is a technology that both are for.
+bool meet(const Rule& a, const Rule& b) {
+    return a.technologies.empty() || b.technologies.empty() ||
+           std::any_of(a.technologies.begin(), a.technologies.end(), [&b](const std::string& each) {
+               return std::find(b.technologies.begin(), b.technologies.end(), each) != b.technologies.end();
+           });
+}
+
+} // namespace
+
 RuleSet::RuleSet(std::span<const Catalogue* const> catalogues)
     : _catalogues(catalogues.begin(), catalogues.end()) {}
 
@@ -42,20 +54,26 @@ void RuleSet::add(const RuleFile& file) {
 }
 
 std::string RuleSet::insert(Rule rule) {
-    const auto place = std::lower_bound(
-        _rules.begin(), _rules.end(), rule.name,
-        [](const std::shared_ptr<const Rule>& each, const std::string& name) { return each->name < name; });
-    if (place != _rules.end() && (*place)->name == rule.name) {
-        const Rule& other = **place;
-        if (other.layer == rule.layer)
-            return "got a second rule " + rule.name + "; the first is at " + other.file + ":" +
-                   std::to_string(other.line);
-        if (other.layer < rule.layer)
-            *place = std::make_shared<const Rule>(std::move(rule));
+    const auto isBefore = [](const std::shared_ptr<const Rule>& each, const std::string& name) {
+        return each->name < name;
+    };
+    const auto first = std::lower_bound(_rules.begin(), _rules.end(), rule.name, isBefore);
+    const auto end =
+        std::find_if(first, _rules.end(), [&rule](const auto& each) { return each->name != rule.name; });
+    if (first != end && (*first)->layer > rule.layer)
         return {};
-    }
+    if (first != end && (*first)->layer < rule.layer)
+        _rules.erase(first, end);
+    else if (const auto other =
+                 std::find_if(first, end, [&rule](const auto& each) { return meet(*each, rule); });
+             other != end)
+        return "got a second rule " + rule.name + " for the same technology; the first is at " +
+               (*other)->file + ":" + std::to_string((*other)->line);
     if (_rules.size() == mostRules)
         return "got more than " + std::to_string(mostRules) + " rules";
+    const auto place = std::upper_bound(
+        _rules.begin(), _rules.end(), rule.name,
+        [](const std::string& name, const std::shared_ptr<const Rule>& each) { return name < each->name; });
     _rules.insert(place, std::make_shared<const Rule>(std::move(rule)));
     return {};
 }
@@ -63,7 +81,8 @@ std::string RuleSet::insert(Rule rule) {
 std::vector<RuleSet::Summary> RuleSet::summaries() const {
     std::vector<Summary> all;
     for (const auto& rule : _rules)
-        all.push_back({rule->name, rule->severity, rule->text, rule->file, rule->lasts});
+        if (all.empty() || all.back().name != rule->name)
+            all.push_back({rule->name, rule->severity, rule->text, rule->file, rule->lasts});
     return all;
 }
 

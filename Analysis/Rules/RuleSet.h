@@ -24,8 +24,8 @@ struct Rule;
 struct RuleFile {
     std::string name; ///< for messages: its path
     std::string text;
-    /// A rule replaces one of the same name of a lower layer: built-in rules, the user's, those given on the
-    /// command line. Within a layer the name is an error.
+    /// A rule replaces all of the same name of a lower layer: built-in rules, the user's, those given on the
+    /// command line. Within a layer rules of one name must be for different technologies.
     int layer = 0;
 };
 
@@ -55,7 +55,7 @@ public:
 
     /// The mistakes of all files, in the order in which they were added; empty where there are none.
     [[nodiscard]] const std::vector<RuleError>& errors() const { return _errors; }
-    /// By name.
+    /// By name; of several rules of one name that of the first.
     [[nodiscard]] std::vector<Summary> summaries() const;
     /// By name.
     [[nodiscard]] std::span<const std::shared_ptr<const Rule>> rules() const { return _rules; }

@@ -9,6 +9,7 @@
 #include "Platform/TelephonyService.h"
 
 #include <limits>
+#include <utility>
 
 namespace velmora {
 
@@ -36,20 +37,36 @@ AllCatalogues::AllCatalogues() {
         }
 }
 
-RuleSet loadOnlyRules(const AllCatalogues& catalogues, std::span<const std::string> files) {
-    RuleSet rules(catalogues.all());
+std::vector<RulePath> standardRulePaths() {
+    std::vector<RulePath> paths;
+    for (const FolderFile& each : filesInFolder(FileResources::standardDirectories(), "rules", "toml"))
+        paths.push_back({each.path.string(), each.layer});
+    return paths;
+}
+
+std::vector<RulePath> rulePaths(std::span<const std::string> files) {
+    std::vector<RulePath> paths;
     for (const std::string& file : files)
-        addFile(file, layerOfGivenFiles, rules);
+        paths.push_back({file, layerOfGivenFiles});
+    return paths;
+}
+
+RuleSet readRules(const AllCatalogues& catalogues, std::span<const RulePath> paths) {
+    RuleSet rules(catalogues.all());
+    for (const RulePath& each : paths)
+        addFile(each.path, each.layer, rules);
     return rules;
 }
 
+RuleSet loadOnlyRules(const AllCatalogues& catalogues, std::span<const std::string> files) {
+    return readRules(catalogues, rulePaths(files));
+}
+
 RuleSet loadRules(const AllCatalogues& catalogues, std::span<const std::string> files) {
-    RuleSet rules(catalogues.all());
-    for (const FolderFile& each : filesInFolder(FileResources::standardDirectories(), "rules", "toml"))
-        addFile(each.path.string(), each.layer, rules);
-    for (const std::string& file : files)
-        addFile(file, layerOfGivenFiles, rules);
-    return rules;
+    std::vector<RulePath> paths = standardRulePaths();
+    for (RulePath& each : rulePaths(files))
+        paths.push_back(std::move(each));
+    return readRules(catalogues, paths);
 }
 
 } // namespace velmora

@@ -27,8 +27,22 @@ private:
     std::vector<const Catalogue*> _catalogues;
 };
 
-/// The built-in rules and the user's, then those of the files. A file that cannot be read is among the set's
-/// errors. The catalogues must outlive the set.
+/// A rule file and its layer, as a RuleSet has them.
+struct RulePath {
+    std::string path;
+    int layer;
+};
+
+/// The files of the built-in rules and of the user's.
+[[nodiscard]] std::vector<RulePath> standardRulePaths();
+/// Files that the command line names: their rules replace all others.
+[[nodiscard]] std::vector<RulePath> rulePaths(std::span<const std::string> files);
+
+/// The rules of the files. A file that cannot be read is among the set's errors. The catalogues must outlive
+/// the set.
+[[nodiscard]] RuleSet readRules(const AllCatalogues& catalogues, std::span<const RulePath> paths);
+
+/// The built-in rules and the user's, then those of the files.
 [[nodiscard]] RuleSet loadRules(const AllCatalogues& catalogues, std::span<const std::string> files);
 /// Those of the files alone.
 [[nodiscard]] RuleSet loadOnlyRules(const AllCatalogues& catalogues, std::span<const std::string> files);

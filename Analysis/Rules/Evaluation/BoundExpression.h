@@ -22,8 +22,8 @@ public:
     /// The expression must outlive it.
     BoundExpression(const Expression& expression, InputStore& inputs);
 
-    /// The value in this turn. To be called in every turn that touches one of its slots or that it wants to
-    /// be woken in.
+    /// The value in this turn. To be called once in every turn that touches one of its slots, and in those
+    /// that it asks for.
     [[nodiscard]] RuleValue evaluate(const InputStore& inputs, Wakeup& wakeup);
     /// Windows forget what they have kept.
     void clear();

@@ -18,14 +18,14 @@ void RuleProgress::reset() {
 }
 
 bool RuleProgress::isLost(Time now, bool isKnown, Wakeup& wakeup) {
+    if (_unknown && now - *_unknown >= Rule::longestUnknown)
+        return true;
     if (isKnown) {
         _unknown.reset();
         return false;
     }
     if (!_unknown)
         _unknown = now;
-    if (now - *_unknown >= Rule::longestUnknown)
-        return true;
     wakeup.by(*_unknown + Rule::longestUnknown);
     return false;
 }
@@ -37,12 +37,8 @@ RuleProgress::Outcome RuleProgress::stepIdle(Time now, const RuleValue& when, co
         reset();
         return Outcome::Nothing;
     }
-    if (!_begin && !when.isTrue())
-        return Outcome::Nothing;
-    if (isLost(now, when.isKnown(), wakeup)) {
+    if (_begin && isLost(now, when.isKnown(), wakeup))
         reset();
-        return Outcome::Nothing;
-    }
     if (!when.isTrue())
         return Outcome::Nothing;
     if (!_begin) {

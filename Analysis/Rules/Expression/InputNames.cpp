@@ -114,9 +114,9 @@ Result<RuleInput> InputNames::find(std::string_view path) const {
         const std::vector<PathLeaf> leaves = leavesAt(*catalogue, path);
         for (const PathLeaf& each : leaves)
             search.add(*catalogue, each);
-        const bool isPossible = pattern.isPossible(*catalogue);
-        isOpen = isOpen || (isPossible && leaves.empty() && canHaveFurtherLeaf(*catalogue, path));
-        isNode = isNode || isPossible;
+        const bool isFurther = leaves.empty() && canHaveFurtherLeaf(*catalogue, path);
+        isOpen = isOpen || (isFurther && _further == Further::ArePossible);
+        isNode = isNode || (!isFurther && pattern.isPossible(*catalogue));
     }
     if (!search.reason.empty())
         return Failure{"'" + std::string(path) + "': " + search.reason};

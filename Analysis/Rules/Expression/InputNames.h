@@ -8,6 +8,7 @@
 #include "Platform/Result.h"
 
 #include <cstddef>
+#include <cstdint>
 #include <functional>
 #include <map>
 #include <span>
@@ -21,8 +22,12 @@ namespace velmora {
 /// The names by which rules read values, with the types that the catalogues of some technologies give them.
 class InputNames {
 public:
-    /// The catalogues must outlive it.
-    explicit InputNames(std::vector<const Catalogue*> catalogues) : _catalogues(std::move(catalogues)) {}
+    enum class Further : std::uint8_t { AreMistakes, ArePossible };
+
+    /// `further`: paths that the catalogues do not have, but that messages may name. The catalogues must
+    /// outlive it.
+    explicit InputNames(std::vector<const Catalogue*> catalogues, Further further = Further::AreMistakes)
+        : _catalogues(std::move(catalogues)), _further(further) {}
 
     /// A role, "neighbour.detected", "radio.technology" or "radio.mode". The reason lists the nearest names.
     [[nodiscard]] static Result<RuleInput> named(std::string_view name);
@@ -37,6 +42,7 @@ private:
     [[nodiscard]] Result<RuleInput> find(std::string_view path) const;
 
     std::vector<const Catalogue*> _catalogues;
+    Further _further;
     mutable std::map<std::string, Result<RuleInput>, std::less<>> _paths; ///< looked up already
 };
 

@@ -24,6 +24,11 @@ bool isLetter(char c) {
     return (c >= 'a' && c <= 'z') || (c >= 'A' && c <= 'Z') || c == '_';
 }
 
+std::string_view wordAtFront(std::string_view text) {
+    return text.substr(
+        0, static_cast<std::size_t>(std::find_if_not(text.begin(), text.end(), isLetter) - text.begin()));
+}
+
 constexpr std::string_view symbols[] = {"<=", ">=", "==", "!=", "..", "<", ">", "+",
                                         "-",  "*",  "/",  "(",  ")",  ",", "="};
 
@@ -62,13 +67,11 @@ void Lexer::readNumber() {
         _token.unit = unit->unit;
         _token.hasUnit = true;
         end = next + unit->name.size();
-    } else if (end < _text.size() && isLetter(_text[end])) {
-        const std::size_t wordEnd = static_cast<std::size_t>(
-            std::find_if_not(_text.begin() + static_cast<std::ptrdiff_t>(end), _text.end(), isLetter) -
-            _text.begin());
-        throw ExpressionMistake(end, "got the unit " + std::string(_text.substr(end, wordEnd - end)) +
-                                         ", wanted dBm, dB, %, kbit/s, Mbit/s, ms, s, min, h, MHz, byte, m, "
-                                         "km or deg");
+    } else if (const std::string_view word = wordAtFront(_text.substr(next));
+               !word.empty() && word != "and" && word != "or" && word != "in") {
+        throw ExpressionMistake(next, "got the unit " + std::string(word) +
+                                          ", wanted dBm, dB, %, kbit/s, Mbit/s, ms, s, min, h, MHz, byte, m, "
+                                          "km or deg");
     }
     _token.text = _text.substr(_at, end - _at);
     _at = end;

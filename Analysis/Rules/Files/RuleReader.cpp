@@ -129,7 +129,10 @@ const InputNames* RuleReader::namesFor(const std::vector<std::string>& technolog
         if (technologies.empty() ||
             std::find(technologies.begin(), technologies.end(), each->technology()) != technologies.end())
             chosen.push_back(each);
-    return &_names.emplace(technologies, InputNames(std::move(chosen))).first->second;
+    // Messages of IFX may have any paths: without a technology a mistyped one would never be noticed.
+    const auto further =
+        technologies.empty() ? InputNames::Further::AreMistakes : InputNames::Further::ArePossible;
+    return &_names.emplace(technologies, InputNames(std::move(chosen), further)).first->second;
 }
 
 void RuleReader::readTechnologies(const TOMLNode& node, std::vector<std::string>& technologies) {
