@@ -38,7 +38,7 @@ void RuleSet::add(const RuleFile& file) {
                       std::to_string(mostBytes)});
         return;
     }
-    FileErrors errors(file.name, file.text, _errors);
+    FileErrors errors(file.name, file.text, file.isBuiltIn ? _leftOut : _errors);
     const auto document = readTOML(file.text);
     if (const auto* const mistake = std::get_if<TOMLError>(&document)) {
         errors.add(mistake->position, mistake->text);

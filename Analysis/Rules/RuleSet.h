@@ -27,6 +27,9 @@ struct RuleFile {
     /// A rule replaces all of the same name of a lower layer: built-in rules, the user's, those given on the
     /// command line. Within a layer rules of one name must be for different technologies.
     int layer = 0;
+    /// A display template of the user's own may not have the paths of rules that come along. These are left
+    /// out then, which is no mistake.
+    bool isBuiltIn = false;
 };
 
 /// The rules of several files, checked against the catalogues of all technologies. A rule with a mistake is
@@ -55,6 +58,8 @@ public:
 
     /// The mistakes of all files, in the order in which they were added; empty where there are none.
     [[nodiscard]] const std::vector<RuleError>& errors() const { return _errors; }
+    /// The rules of built-in files that are left out, with the reason.
+    [[nodiscard]] const std::vector<RuleError>& leftOut() const { return _leftOut; }
     /// By name; of several rules of one name that of the first.
     [[nodiscard]] std::vector<Summary> summaries() const;
     /// By name.
@@ -71,6 +76,7 @@ private:
     std::vector<const Catalogue*> _catalogues;
     std::vector<std::shared_ptr<const Rule>> _rules; ///< by name
     std::vector<RuleError> _errors;
+    std::vector<RuleError> _leftOut;
 };
 
 /// Finds the events of the rules in what the messages of a technology report. Rules that use nothing that the

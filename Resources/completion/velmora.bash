@@ -187,7 +187,7 @@ _velmora_log() {
         if [[ $cur == -* ]]; then
             _velmora_offer "${options[@]}" --version
         else
-            _velmora_offer decode watch record convert info fields events
+            _velmora_offer decode watch record convert info fields events rules
         fi
         return
         ;;
@@ -206,6 +206,8 @@ _velmora_log() {
     fi
     # As many files as the command takes.
     case $command:$files in
+    rules:0) _velmora_offer check test ;;
+    rules:*) _filedir toml ;;
     decode:* | info:* | events:* | record:0 | convert:[01]) _filedir '@(pcapng|velmora|dlf)' ;;
     esac
 }

@@ -8,6 +8,8 @@
 #include "Platform/Linux/Files/FolderFiles.h"
 #include "Platform/TelephonyService.h"
 
+#include <algorithm>
+#include <filesystem>
 #include <limits>
 #include <utility>
 
@@ -17,14 +19,20 @@ namespace {
 
 constexpr int layerOfGivenFiles = std::numeric_limits<int>::max();
 
-void addFile(const std::string& path, int layer, RuleSet& rules) {
-    const Result<Data> content = readFile(path, RuleSet::mostBytes);
+void addFile(const RulePath& file, RuleSet& rules) {
+    const Result<Data> content = readFile(file.path, RuleSet::mostBytes);
     if (!content) {
-        rules.addError({path, 0, 0, content.reason()});
+        rules.addError({file.path, 0, 0, content.reason()});
         return;
     }
     const Bytes bytes = content->bytes();
-    rules.add({path, std::string(bytes.begin(), bytes.end()), layer});
+    rules.add({file.path, std::string(bytes.begin(), bytes.end()), file.layer, file.isBuiltIn});
+}
+
+/// Whether the file is in one of the directories of the user's own.
+bool isUsers(const std::filesystem::path& file) {
+    const std::vector<std::filesystem::path> own = FileResources::ownDirectories();
+    return std::find(own.begin(), own.end(), file.parent_path().parent_path()) != own.end();
 }
 
 } // namespace
@@ -40,21 +48,21 @@ AllCatalogues::AllCatalogues() {
 std::vector<RulePath> standardRulePaths() {
     std::vector<RulePath> paths;
     for (const FolderFile& each : filesInFolder(FileResources::standardDirectories(), "rules", "toml"))
-        paths.push_back({each.path.string(), each.layer});
+        paths.push_back({each.path.string(), each.layer, !isUsers(each.path)});
     return paths;
 }
 
 std::vector<RulePath> rulePaths(std::span<const std::string> files) {
     std::vector<RulePath> paths;
     for (const std::string& file : files)
-        paths.push_back({file, layerOfGivenFiles});
+        paths.push_back({file, layerOfGivenFiles, false});
     return paths;
 }
 
 RuleSet readRules(const AllCatalogues& catalogues, std::span<const RulePath> paths) {
     RuleSet rules(catalogues.all());
     for (const RulePath& each : paths)
-        addFile(each.path, each.layer, rules);
+        addFile(each, rules);
     return rules;
 }
 

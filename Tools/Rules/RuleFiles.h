@@ -31,6 +31,7 @@ private:
 struct RulePath {
     std::string path;
     int layer;
+    bool isBuiltIn = false;
 };
 
 /// The files of the built-in rules and of the user's.

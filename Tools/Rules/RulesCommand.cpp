@@ -66,6 +66,8 @@ int runRules(const RulesOptions& options, Output& output) {
     const RuleSet rules = readRules(catalogues, paths);
     for (const RuleError& each : rules.errors())
         report(printableLine(each.message()));
+    for (const RuleError& each : rules.leftOut())
+        report(printableLine(each.message()) + "; the rule is left out");
     bool isRight = rules.errors().empty();
 
     std::map<std::string, FileCounts> counts;

@@ -62,12 +62,13 @@ RuleValue Evaluator::evaluate(std::uint32_t index) {
 
 RuleValue Evaluator::connect(const ExpressionNode& node) {
     const bool decisive = node.operation == Operation::Or;
-    // Both are evaluated, so that either can ask to be evaluated again.
     const RuleValue first = evaluate(node.first);
+    // The other one cannot change the value before this one does.
+    if (first.isKnown() && first.isTrue() == decisive)
+        return first;
     const RuleValue second = evaluate(node.second);
-    for (const RuleValue& each : {first, second})
-        if (each.isKnown() && each.isTrue() == decisive)
-            return each;
+    if (second.isKnown() && second.isTrue() == decisive)
+        return second;
     return first.isKnown() ? second : first;
 }
 

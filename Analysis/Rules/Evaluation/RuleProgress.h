@@ -34,6 +34,8 @@ public:
     void reset();
 
     [[nodiscard]] bool isActive() const { return _isActive; }
+    /// Whether `when` has held and an event may have begun.
+    [[nodiscard]] bool hasBegun() const { return _begin.has_value(); }
     [[nodiscard]] Time begin() const { return *_begin; }
     /// Since when what ends the event has held; absent where it does not.
     [[nodiscard]] std::optional<Time> end() const { return _end; }

@@ -65,7 +65,10 @@ std::vector<std::uint32_t> RuleState::slots() const {
 Wakeup RuleState::evaluate(const InputStore& inputs, EventSink& sink) {
     Wakeup wakeup;
     const RuleValue when = _when.evaluate(inputs, wakeup);
-    const RuleValue ends = _clear ? _clear->evaluate(inputs, wakeup) : opposite(when);
+    // Most of the time nothing has begun that could end. What looks back in time has to look all the same.
+    const bool canEnd =
+        _progress.hasBegun() || when.isTrue() || (_clear && !_clear->expression().windows.empty());
+    const RuleValue ends = !_clear ? opposite(when) : canEnd ? _clear->evaluate(inputs, wakeup) : RuleValue();
     if (_progress.isActive() && when.isTrue() && isTouched(inputs))
         _evidence.add(inputs.message());
     for (;;) {

@@ -8,6 +8,7 @@
 #include "Analysis/Rules/Files/RuleTestReader.h"
 #include "Analysis/Rules/Files/RuleText.h"
 #include "Analysis/Rules/Files/TableReader.h"
+#include "Analysis/Rules/Files/TechnologyNames.h"
 #include "Platform/PrintableText.h"
 
 #include <algorithm>
@@ -29,18 +30,6 @@ bool isKindName(std::string_view name) {
     return !name.empty() && name.size() <= longest && isLetter(name[0]) && !name.ends_with('-') &&
            std::all_of(name.begin(), name.end(),
                        [&](char c) { return isLetter(c) || (c >= '0' && c <= '9') || c == '-'; });
-}
-
-bool isSameInAnyCase(std::string_view a, std::string_view b) {
-    const auto lower = [](char c) { return c >= 'A' && c <= 'Z' ? static_cast<char>(c - 'A' + 'a') : c; };
-    return std::equal(a.begin(), a.end(), b.begin(), b.end(),
-                      [lower](char one, char other) { return lower(one) == lower(other); });
-}
-
-/// "LTE" for "Ostrel_LTE", "UTRAN" for "Ostrel_UTRAN2".
-std::string_view formWithoutMaker(std::string_view name) {
-    name.remove_prefix(name.find('_') + 1);
-    return name.substr(0, name.find_last_not_of("0123456789") + 1);
 }
 
 } // namespace
@@ -136,27 +125,20 @@ const InputNames* RuleReader::namesFor(const std::vector<std::string>& technolog
 }
 
 void RuleReader::readTechnologies(const TOMLNode& node, std::vector<std::string>& technologies) {
-    std::vector<std::string_view> known;
-    for (const Catalogue* const each : _catalogues)
-        known.push_back(each->technology());
     const auto addNamed = [&](const TOMLNode& name) {
-        const auto found = std::find_if(known.begin(), known.end(), [&name](std::string_view each) {
-            return isSameInAnyCase(name.text, each) || isSameInAnyCase(name.text, formWithoutMaker(each));
-        });
-        if (name.kind == TOMLNode::Kind::Text && found != known.end()) {
-            technologies.emplace_back(*found);
+        const bool isText = name.kind == TOMLNode::Kind::Text;
+        if (const Catalogue* const named = isText ? catalogueNamed(_catalogues, name.text) : nullptr) {
+            technologies.push_back(named->technology());
             return;
         }
         std::string all;
-        for (const std::string_view each : known)
-            all.append(all.empty() ? "" : ", ").append(each);
-        _errors.add(name.position, "got " +
-                                       (name.kind == TOMLNode::Kind::Text
-                                            ? "the technology " + printableLine(name.text.substr(0, 64))
-                                            : std::string(nameOf(name.kind))) +
-                                       ", wanted one or an array of " + all);
+        for (const Catalogue* const each : _catalogues)
+            all.append(all.empty() ? "" : ", ").append(each->technology());
+        const std::string got = isText ? "the technology " + printableLine(name.text.substr(0, 64))
+                                       : std::string(nameOf(name.kind));
+        _errors.add(name.position, "got " + got + ", wanted one or an array of " + all);
     };
-    if (node.kind == TOMLNode::Kind::Array && !node.items.empty() && node.items.size() <= known.size())
+    if (node.kind == TOMLNode::Kind::Array && !node.items.empty() && node.items.size() <= _catalogues.size())
         std::for_each(node.items.begin(), node.items.end(), addNamed);
     else
         addNamed(node);

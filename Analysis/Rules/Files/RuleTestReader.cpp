@@ -5,6 +5,7 @@
 
 #include "Analysis/Rules/Expression/PathLeaves.h"
 #include "Analysis/Rules/Files/TableReader.h"
+#include "Analysis/Rules/Files/TechnologyNames.h"
 #include "Platform/PrintableText.h"
 
 #include <algorithm>
@@ -80,13 +81,18 @@ RuleTest RuleTestReader::readTest(const TOMLNode& table) {
 }
 
 const Catalogue* RuleTestReader::catalogueOf(const TOMLNode& table) {
-    const TOMLNode* const technology = table.find("technology");
+    if (const TOMLNode* const technology = table.find("technology")) {
+        const Catalogue* const named =
+            technology->kind == Kind::Text ? catalogueNamed(_names.catalogues(), technology->text) : nullptr;
+        if (named && concerns(_rule, *named))
+            return named;
+        _errors.add(technology->position, "got a technology that the rule does not concern");
+        return nullptr;
+    }
     for (const Catalogue* const each : _names.catalogues())
-        if (concerns(_rule, *each) && (!technology || (technology->kind == Kind::Text &&
-                                                       each->technology().ends_with(technology->text))))
+        if (concerns(_rule, *each))
             return each;
-    _errors.add(technology ? technology->position : table.position,
-                "got a technology that the rule does not concern");
+    _errors.add(table.position, "got a rule that concerns no technology");
     return nullptr;
 }
 
@@ -100,14 +106,23 @@ void RuleTestReader::readStep(const TOMLNode& table, RuleTest& test) {
     if (!test.steps.empty() && step.at < test.steps.back().at)
         _errors.add(table.position, "got a time before the one above, wanted times in order");
     readValues(table, "", step);
-    if (const TOMLNode* const neighbours = table.find("neighbours"))
+    if (const TOMLNode* const neighbours = find(table, "neighbours", Kind::Array))
         readNeighbours(*neighbours, step);
-    if (const TOMLNode* const interruption = table.find("interruption"))
+    if (const TOMLNode* const interruption = find(table, "interruption", Kind::Flag))
         step.isInterruption = interruption->flag;
-    if (const TOMLNode* const unknown = table.find("unknown"))
+    if (const TOMLNode* const unknown = find(table, "unknown", Kind::Array))
         for (const TOMLNode& each : unknown->items)
             readValue(each.text, each.position, nullptr, step);
     test.steps.push_back(std::move(step));
+}
+
+const TOMLNode* RuleTestReader::find(const TOMLNode& table, std::string_view key, Kind kind) {
+    const TOMLNode* const found = table.find(key);
+    if (!found || found->kind == kind)
+        return found;
+    _errors.add(found->position, "got " + std::string(nameOf(found->kind)) + " for " + std::string(key) +
+                                     ", wanted " + std::string(nameOf(kind)));
+    return nullptr;
 }
 
 void RuleTestReader::readValues(const TOMLNode& table, const std::string& prefix, RuleTestStep& step) {
@@ -151,9 +166,6 @@ void RuleTestReader::readValue(const std::string& name, TextPosition position, c
 
 void RuleTestReader::readNeighbours(const TOMLNode& node, RuleTestStep& step) {
     step.neighbours.emplace();
-    if (node.kind != Kind::Array)
-        _errors.add(node.position,
-                    "got " + std::string(nameOf(node.kind)) + " for neighbours, wanted an array");
     for (const TOMLNode& each : node.items) {
         TableReader keys(each, neighbourKeys, _errors);
         const auto number = [&keys](std::string_view key) {

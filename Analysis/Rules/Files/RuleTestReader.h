@@ -26,6 +26,8 @@ public:
 private:
     [[nodiscard]] RuleTest readTest(const TOMLNode& table);
     [[nodiscard]] const Catalogue* catalogueOf(const TOMLNode& table);
+    /// Null where a step has no such key, or where it is of another kind, which is a mistake.
+    [[nodiscard]] const TOMLNode* find(const TOMLNode& table, std::string_view key, TOMLNode::Kind kind);
     void readStep(const TOMLNode& table, RuleTest& test);
     /// The values of a table, of which names with a dot may be tables in it.
     void readValues(const TOMLNode& table, const std::string& prefix, RuleTestStep& step);

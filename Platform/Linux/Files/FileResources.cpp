@@ -23,18 +23,25 @@ constexpr std::size_t maximumResourceSize = std::size_t{64} << 20;
 FileResources::FileResources(std::vector<std::filesystem::path> directories)
     : _directories(std::move(directories)) {}
 
+std::vector<std::filesystem::path> FileResources::ownDirectories() {
+    std::vector<std::filesystem::path> directories;
+    if (const auto own = environmentPath("VELMORA_RESOURCES"); !own.empty())
+        directories.push_back(own);
+    if (const auto config = environmentPath("XDG_CONFIG_HOME"); config.is_absolute())
+        directories.push_back(config / "velmora");
+    else if (const auto home = environmentPath("HOME"); home.is_absolute())
+        directories.push_back(home / ".config/velmora");
+    return directories;
+}
+
 std::vector<std::filesystem::path> FileResources::standardDirectories() {
     std::vector<std::filesystem::path> directories;
     const auto add = [&directories](const std::filesystem::path& directory) {
         if (std::find(directories.begin(), directories.end(), directory) == directories.end())
             directories.push_back(directory);
     };
-    if (const auto own = environmentPath("VELMORA_RESOURCES"); !own.empty())
+    for (const std::filesystem::path& own : ownDirectories())
         add(own);
-    if (const auto config = environmentPath("XDG_CONFIG_HOME"); config.is_absolute())
-        add(config / "velmora");
-    else if (const auto home = environmentPath("HOME"); home.is_absolute())
-        add(home / ".config/velmora");
     std::error_code error;
     if (const auto program = std::filesystem::read_symlink("/proc/self/exe", error); !error)
         add((program.parent_path() / "../share/velmora").lexically_normal());

@@ -22,6 +22,9 @@ public:
     /// configured so; each once.
     [[nodiscard]] static std::vector<std::filesystem::path> standardDirectories();
 
+    /// The first two of these.
+    [[nodiscard]] static std::vector<std::filesystem::path> ownDirectories();
+
     /// A resource that exists but cannot be read is a failure; later directories are not searched.
     [[nodiscard]] Result<Data> read(std::string_view name, std::string_view type) const override;
     [[nodiscard]] std::vector<std::string> list(std::string_view type) const override;

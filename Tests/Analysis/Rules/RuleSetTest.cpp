@@ -80,6 +80,17 @@ TEST_F(RuleSetTest, ABoundedNumberOfRulesIsTaken) {
     EXPECT_EQ(rules.errors().front().text, "got more than 4096 rules");
 }
 
+TEST_F(RuleSetTest, ABuiltInRuleWhosePathsTheDisplayLacksIsLeftOutWithoutAMistake) {
+    const std::string other = "[[rule]]\nname = \"c\"\nwhen = \"'/Mine/Level' < 3\"\ntext = \"\"\n";
+    rules.add({"built-in.toml", other + rule("a", "1"), 1, true});
+    EXPECT_TRUE(rules.errors().empty());
+    ASSERT_EQ(rules.leftOut().size(), 1U);
+    EXPECT_EQ(rules.leftOut()[0].line, 3U);
+    EXPECT_THAT(texts(rules), ElementsAre("a 1"));
+    rules.add({"mine.toml", other, 2});
+    EXPECT_EQ(rules.errors().size(), 1U);
+}
+
 TEST_F(RuleSetTest, ALongFileIsNotRead) {
     rules.add({"one.toml", std::string(RuleSet::mostBytes + 1, '#'), 1});
     ASSERT_EQ(rules.errors().size(), 1U);
