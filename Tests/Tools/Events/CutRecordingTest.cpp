@@ -54,8 +54,8 @@ TEST_P(CutRecordingTest, TwoFilesHaveTheEventsOfTheWhole) {
 INSTANTIATE_TEST_SUITE_P(Technologies, CutRecordingTest,
                          testing::Values("gsm.pcapng", "lte.pcapng", "utran.pcapng", "c2k.pcapng",
                                          "ifx.pcapng", "modem.pcapng"),
-                         [](const auto& info) {
-                             const std::string name = info.param;
+                         [](const auto& each) {
+                             const std::string name = each.param;
                              return name.substr(0, name.find('.'));
                          });
 

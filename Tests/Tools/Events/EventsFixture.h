@@ -3,6 +3,7 @@
 
 #pragma once
 
+#include "Platform/Linux/LoopTimer.h"
 #include "Tests/Tools/ToolFixture.h"
 
 #include <gmock/gmock.h>
@@ -10,6 +11,7 @@
 
 #include <filesystem>
 #include <fstream>
+#include <functional>
 #include <iterator>
 
 #include <string>
@@ -47,6 +49,12 @@ protected:
         for (std::size_t begin = 0, end = 0; (end = output.find('\n', begin)) != output.npos; begin = end + 1)
             lines.push_back(nlohmann::json::parse(output.substr(begin, end - begin)));
         return lines;
+    }
+    /// As `eventually`, of what changes without an event of the loop.
+    [[nodiscard]] static bool comesToBe(const std::function<bool()>& condition) {
+        LoopTimer look([] {});
+        look.startRepeating(std::chrono::milliseconds(20));
+        return eventually(condition);
     }
     [[nodiscard]] std::string withRules(const std::string& text) const {
         std::ofstream(path("my.toml")) << text;
