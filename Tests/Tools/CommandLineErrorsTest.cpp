@@ -24,9 +24,10 @@ TEST(CommandLineErrorsTest, UsageErrorsGiveTheFoundAndTheExpectedValue) {
         std::string message;
     };
     const Case cases[] = {
-        {{}, "no command, wanted decode, watch, record, convert, info, fields or rules"},
+        {{}, "no command, wanted decode, watch, record, convert, info, fields, events or rules"},
         {{"bogus"},
-         "got bogus, wanted one of the commands decode, watch, record, convert, info, fields and rules"},
+         "got bogus, wanted one of the commands decode, watch, record, convert, info, fields, events and "
+         "rules"},
         {{"decode"}, "FILE is required"},
         {{"decode", "--format", "xml", "a"}, "--format: got xml, wanted text or json or jsonl or csv"},
         {{"decode", "--every", "day", "a"}, "--every: got day, wanted refresh or message"},

@@ -22,7 +22,7 @@ namespace velmora {
 
 /// Decodes messages of files that follow each other, or of the service, and passes what they report to one
 /// analysis a technology. Decoders and analyses continue from file to file, so that a recording that is cut
-/// in two is analysed like the whole one. Main thread only.
+/// in two is analysed like the uncut one. Main thread only.
 class AnalysisFeed {
 public:
     AnalysisFeed(AnalysisClock clock, MakeAnalysis make);

@@ -10,7 +10,7 @@
 
 namespace velmora {
 
-/// What a program is told of the event that it runs for, as variables of its environment ("NAME=value"):
+/// The event that a program runs for, as variables of its environment ("NAME=value"):
 /// VELMORA_EVENT_KIND, _STATE, _SEVERITY, _TIME, _END (empty while there is none), _TECHNOLOGY, _TEXT and
 /// _EVIDENCE, and one for each field: VELMORA_EVENT_FROM, VELMORA_EVENT_TO_CHANNEL of "to.channel". Values
 /// are made printable, so that they hold no zero character, line feed or other control character, and cut at

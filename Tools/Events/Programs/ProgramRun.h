@@ -18,7 +18,7 @@ namespace velmora {
 
 /// A program that runs in a process group of its own, with nothing on its standard input, its standard output
 /// on our standard error, and a time limit: then the group is terminated, and killed where that does not end
-/// it. What it leaves in the background when it ends by itself goes on.
+/// it. When it ends within its time, what it has started in the background continues.
 class ProgramRun {
 public:
     using Clock = std::chrono::steady_clock;
