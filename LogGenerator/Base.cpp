@@ -58,8 +58,10 @@ void Base::updateWithData(const Data& data, std::uint32_t logCode) {
         return;
     }
     const Record record(data);
-    if (record.size() < view->minimumLength)
+    if (record.size() < view->minimumLength) {
+        observeDamage(Damage::TooShort);
         return;
+    }
     check(*view, record);
     keep(*view, record.part(0, std::min(view->readLength, record.size())), partsOf(*view, record));
 }
@@ -163,15 +165,22 @@ std::int16_t Base::lookUpECNO(std::uint32_t value) {
     return 0; // as for 0 dB and above, on purpose
 }
 
-void Base::reportMissingEntries(const CountedList& list, std::uint32_t logCode) {
+void Base::observeDamage(Damage damage) const {
+    if (_observer)
+        _observer->damaged(damage);
+}
+
+void Base::reportMissingEntries(const CountedList& list, std::uint32_t logCode) const {
     if (!list.isComplete())
         reportMissingEntries(list.completeCount(), list.count(), logCode);
 }
 
-void Base::reportMissingEntries(std::size_t complete, std::size_t count, std::uint32_t logCode) {
-    if (complete < count)
-        logFormat(LogPriority::Error, "Record 0x%04X: %d of %d entries", logCode, static_cast<int>(complete),
-                  static_cast<int>(count));
+void Base::reportMissingEntries(std::size_t complete, std::size_t count, std::uint32_t logCode) const {
+    if (complete >= count)
+        return;
+    observeDamage(Damage::MissingEntries);
+    logFormat(LogPriority::Error, "Record 0x%04X: %d of %d entries", logCode, static_cast<int>(complete),
+              static_cast<int>(count));
 }
 
 void Base::unknownLogMessage(std::uint32_t logCode) {

@@ -6,6 +6,7 @@
 #include "LogGenerator/Fields/DisplayWriter.h"
 #include "LogGenerator/Fields/FieldVisitor.h"
 #include "LogGenerator/KeptRecords.h"
+#include "LogGenerator/Observations/Damage.h"
 #include "LogGenerator/View.h"
 #include "PropertyLists/Value.h"
 
@@ -128,9 +129,11 @@ protected:
     }
 
     /// "Record 0x5137: 2 of 3 entries", where the record holds fewer than its count.
-    static void reportMissingEntries(const CountedList& list, std::uint32_t logCode);
+    void reportMissingEntries(const CountedList& list, std::uint32_t logCode) const;
     /// The same for a list whose entries' lengths differ: `complete` of `count` lie inside the record.
-    static void reportMissingEntries(std::size_t complete, std::size_t count, std::uint32_t logCode);
+    void reportMissingEntries(std::size_t complete, std::size_t count, std::uint32_t logCode) const;
+    /// What is observed of the message includes that it is malformed.
+    void observeDamage(Damage damage) const;
     /// The error line for a code that the section does not handle.
     static void unknownLogMessage(std::uint32_t logCode);
 

@@ -96,6 +96,8 @@ std::optional<std::uint32_t> OstrelLogGenerator2::route(const Data& message) {
     if (!observer())
         return parsed ? routeParsed(message, *parsed) : std::nullopt;
     observer()->beginMessage();
+    if (!parsed)
+        observer()->damaged(Damage::NoRecord);
     const std::optional<std::uint32_t> code = parsed ? routeParsed(message, *parsed) : std::nullopt;
     passObservations(code, parsed ? parsed->timestamp() : std::nullopt);
     return code;
@@ -104,6 +106,8 @@ std::optional<std::uint32_t> OstrelLogGenerator2::route(const Data& message) {
 std::optional<std::uint32_t> OstrelLogGenerator2::routeParsed(const Data& message, const LogMessage& parsed) {
     if (parsed.type != LogMessage::basebandType && parsed.type != LogMessage::extraType) {
         logFormat(LogPriority::Error, "Invalid log type: %x. Dropping.", static_cast<unsigned>(parsed.type));
+        if (observer())
+            observer()->damaged(Damage::WrongType);
         return std::nullopt;
     }
     const std::uint32_t code = parsed.logCode();

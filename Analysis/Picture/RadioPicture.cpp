@@ -3,57 +3,295 @@
 
 #include "Analysis/Picture/RadioPicture.h"
 
-#include <array>
-#include <utility>
+#include "Analysis/Picture/PhysicalCell.h"
+
+#include <algorithm>
 
 namespace velmora {
 
-std::string_view nameOf(RadioTechnology technology) {
-    static constexpr std::array<std::string_view, 7> names{"GSM", "UMTS",        "TD-SCDMA", "LTE",
-                                                           "NR",  "CDMA2000 1x", "EV-DO"};
-    return names[static_cast<std::size_t>(technology)];
+namespace {
+
+std::optional<double> numberOf(const Reading* reading) {
+    return reading ? std::optional(reading->number) : std::nullopt;
 }
 
-std::string_view nameOf(RadioMode mode) {
-    static constexpr std::array<std::string_view, 4> names{"off", "searching", "idle", "connected"};
-    return names[static_cast<std::size_t>(mode)];
-}
+} // namespace
 
 RadioPicture::RadioPicture(const Catalogue& catalogue)
-    : _catalogue(catalogue), _roles(roleNames().size() + 1) {}
+    : _catalogue(catalogue), _table(technologyTable(catalogue.technology())), _uses(catalogue) {
+    for (RadioSide i = 0; i < radioTechnologies; ++i)
+        _sides[i].technology = static_cast<RadioTechnology>(i);
+}
+
+const LeafUse& RadioPicture::useOf(const CatalogueField& leaf) {
+    return _uses.at(leaf, [this](const CatalogueField& each) {
+        const LeafUse use = velmora::useOf(each, _table);
+        if (use.list && isServing(use.role))
+            _servingLists.push_back({use.list, use.side, use.role});
+        return use;
+    });
+}
 
 void RadioPicture::update(const MessageReport& report) {
+    _change.reset();
+    if (report.observed.damage != Damage::None)
+        return;
+    gather(report);
+    forgetOld(report.time);
+    forgetWithdrawn(report.observed);
+    change(report);
+    keep(report);
+    forgetReplaced(report);
+    findCurrent();
+    if (_neighbours.endMessage(report.time))
+        findStrongest();
+}
+
+void RadioPicture::gather(const MessageReport& report) {
+    for (RadioSideState& each : _sides)
+        each.beginMessage();
+    _named.reset();
+    _neighbours.beginMessage();
     for (const Observation& each : report.observed.observations) {
-        if (each.leaf->role == Role::None)
+        const LeafUse& use = useOf(*each.leaf);
+        if (!use.isUsed)
             continue;
-        std::optional<Reading>& kept = _roles[static_cast<std::size_t>(each.leaf->role)];
-        if (each.kind == ObservedKind::Absent) {
-            kept.reset();
+        if (use.part != NeighbourPart::None || isNeighbour(use.role))
+            _neighbours.add(each, use, report, _table);
+        if (use.modes || use.evidence)
+            keepMode(each, use, report.time);
+        if (each.kind == ObservedKind::Absent)
             continue;
+        if (use.namesTechnology)
+            _named = technologyOf(each.raw, _table);
+        if (!isServing(use.role))
+            continue;
+        RadioSideState& side = _sides[use.side];
+        side.isServing = true;
+        if (use.list && use.role == Role::ServingPhysicalCell)
+            gatherRow(each, side);
+        if (use.list)
+            continue;
+        if (use.role == Role::ServingCell)
+            side.found.cell = each.number;
+        else if (use.role == Role::ServingChannel)
+            side.found.channel = each.number;
+        else if (use.role == Role::ServingPhysicalCell)
+            side.found.physicalCell = physicalCellOf(each);
+    }
+}
+
+/// Of several serving cells, as an active set has them, the known one stays for as long as it is among them.
+void RadioPicture::gatherRow(const Observation& observation, RadioSideState& side) {
+    const Reading* const known = side.readings.find(Role::ServingPhysicalCell);
+    const bool isFirst = !side.list;
+    if (!isFirst && !(known && known->number == observation.number))
+        return;
+    side.list = useOf(*observation.leaf).list;
+    side.row = observation.rows.empty() ? 0 : observation.rows.back();
+    side.found.physicalCell = observation.number;
+}
+
+void RadioPicture::forgetCell(RadioSide side) {
+    _sides[side].readings.forgetServing();
+    _sides[side].isReported = false;
+    _sides[commonSide].readings.forgetServing(); // its network and area
+}
+
+void RadioPicture::forgetOld(Time now) {
+    for (RadioSide i = 0; i < radioSides; ++i) {
+        RadioSideState& side = _sides[i];
+        if (side.isReported && now - side.reported > servingLifetime)
+            forgetCell(i);
+        if (side.mode && !_table.evidence.empty() && now - side.modeReported > servingLifetime)
+            side.setMode({}, false);
+    }
+}
+
+void RadioPicture::forgetWithdrawn(const ObservedMessage& message) {
+    for (const ObservedList& each : message.lists)
+        _neighbours.replaced(*each.list);
+    for (const CatalogueField* const leaf : message.removed) {
+        const LeafUse& use = useOf(*leaf);
+        if (use.list && (isNeighbour(use.role) || use.part != NeighbourPart::None))
+            _neighbours.replaced(*use.list);
+        _sides[use.side].readings.forgetLeaf(use.role, *leaf);
+        if (use.modes)
+            _sides[use.side].setMode({}, false);
+    }
+}
+
+CellIdentity RadioPicture::identity(RadioSide side) const {
+    const RadioSideState& state = _sides[side];
+    CellIdentity cell;
+    cell.technology = side == commonSide ? _technology : state.technology;
+    cell.cell = numberOf(state.readings.find(Role::ServingCell));
+    cell.channel = numberOf(state.readings.find(Role::ServingChannel));
+    cell.physicalCell = numberOf(state.readings.find(Role::ServingPhysicalCell));
+    return cell;
+}
+
+bool RadioPicture::reportsCells(const RadioSideState& side) const {
+    return !_table.hasCellInUseAlone || side.mode == RadioMode::Idle || side.mode == RadioMode::Connected;
+}
+
+void RadioPicture::change(const MessageReport& report) {
+    for (RadioSide i = 0; i < radioSides; ++i) {
+        RadioSideState& side = _sides[i];
+        if (!side.found.isKnown() || !reportsCells(side))
+            continue;
+        side.found.technology = i == commonSide ? _named : side.technology;
+        const bool isOtherSide = !_table.isHybrid && i != _current;
+        const RadioSide before = isOtherSide ? _current : i;
+        RadioSideState& old = _sides[before];
+        const CellIdentity known = identity(before);
+        if (known.isKnown() && areSameCell(known, side.found) == false) {
+            const bool isModeKnown = old.modeBefore.has_value();
+            _change = ServingChange{known,
+                                    side.found,
+                                    isModeKnown ? old.modeBefore : side.mode,
+                                    isModeKnown ? old.wasMovedByNetwork : side.isMovedByNetwork,
+                                    numberOf(old.readings.find(Role::ServingLevel)),
+                                    old.message};
+            forgetCell(before);
+            _neighbours.forgetAll();
+            if (isOtherSide)
+                old.setMode({}, false);
         }
-        Reading reading;
-        reading.kind = each.kind;
-        reading.number = each.kind == ObservedKind::Number ? each.number : static_cast<double>(each.raw);
-        reading.text = each.kind == ObservedKind::Text ? each.words : each.given;
-        reading.time = report.time;
-        const bool isSame = kept && kept->number == reading.number && kept->text == reading.text;
-        reading.since = isSame ? kept->since : report.time;
-        reading.message = report.message;
-        reading.leaf = each.leaf;
-        kept = std::move(reading);
+        if (isOtherSide && _change && side.modeBefore == side.mode)
+            side.setMode({}, false); // of an earlier time on this technology
+        if (!_table.isHybrid) {
+            _current = i;
+            _technology = side.found.technology;
+        }
+        side.isReported = true;
+    }
+    for (RadioSideState& each : _sides)
+        if (each.isServing && each.isReported) {
+            each.reported = report.time;
+            each.message = report.message;
+        }
+}
+
+void RadioPicture::keep(const MessageReport& report) {
+    for (const Observation& each : report.observed.observations) {
+        const LeafUse& use = useOf(*each.leaf);
+        if (use.role == Role::None || isNeighbour(use.role))
+            continue;
+        RadioSideState& side = _sides[use.side];
+        const std::uint32_t row = each.rows.empty() ? 0 : each.rows.back();
+        if (each.kind == ObservedKind::Absent)
+            side.readings.forgetLeaf(use.role, *each.leaf);
+        else if (isServing(use.role) && !reportsCells(side))
+            continue;
+        else if (!use.list || row == (use.list == side.list ? side.row : 0))
+            side.readings.keep(use.role, each, report, _text);
+    }
+}
+
+void RadioPicture::forgetReplaced(const MessageReport& report) {
+    for (const ObservedList& list : report.observed.lists)
+        for (const ServingList& each : _servingLists) {
+            RoleReadings& readings = _sides[each.side].readings;
+            const Reading* const kept = list.list == each.list ? readings.find(each.role) : nullptr;
+            if (kept && kept->message != report.message && useOf(*kept->leaf).list == each.list)
+                readings.forget(each.role);
+        }
+}
+
+void RadioPicture::keepMode(const Observation& observation, const LeafUse& use, Time now) {
+    RadioSideState& side = _sides[use.side];
+    if (use.evidence) {
+        if (observation.kind != ObservedKind::Absent) {
+            side.setMode(use.evidence->mode, use.evidence->mode == RadioMode::Connected);
+            side.modeReported = now;
+        }
+        return;
+    }
+    const std::optional<RadioMode> before = side.mode;
+    side.setMode({}, false);
+    if (observation.kind != ObservedKind::Absent)
+        for (const ModeRow& row : use.modes->rows)
+            if (row.text.empty() ? observation.kind != ObservedKind::Text && row.raw == observation.raw
+                                 : row.text == observation.words)
+                side.setMode(row.mode, row.isMovedByNetwork);
+    if (side.mode == before || (side.mode != RadioMode::Off && side.mode != RadioMode::Searching))
+        return;
+    // There is no serving cell any more. One that this message reports is kept later.
+    for (RadioSide i = 0; i < radioSides; ++i)
+        if (i == use.side || use.side == commonSide)
+            forgetCell(i);
+}
+
+void RadioPicture::findCurrent() {
+    if (_table.isHybrid) {
+        const RadioSideState& data = _sides[sideOf(RadioTechnology::EVDO)];
+        const RadioSideState& voice = _sides[sideOf(RadioTechnology::CDMA1x)];
+        const bool usesData = data.mode == RadioMode::Connected || (data.isReported && !voice.isReported);
+        _current = sideOf(usesData ? RadioTechnology::EVDO : RadioTechnology::CDMA1x);
+    }
+    if (!current().isReported)
+        _technology.reset();
+    else if (_current != commonSide)
+        _technology = current().technology;
+}
+
+void RadioPicture::findStrongest() {
+    _strongest.forgetAll();
+    for (const Neighbour& each : neighbours()) {
+        if (_technology && each.technology && each.technology != _technology)
+            continue;
+        _strongest.keepNeighbour(each);
+        return;
     }
 }
 
 void RadioPicture::clear() {
-    _roles.assign(_roles.size(), std::nullopt);
-    _neighbours.clear();
+    for (RadioSideState& each : _sides) {
+        each.readings.forgetAll();
+        each.setMode({}, false);
+        each.isReported = false;
+    }
+    _neighbours.forgetAll();
+    _strongest.forgetAll();
     _technology.reset();
-    _mode.reset();
+    _change.reset();
 }
 
 const Reading* RadioPicture::find(Role role) const {
-    const std::optional<Reading>& kept = _roles[static_cast<std::size_t>(role)];
-    return kept ? &*kept : nullptr;
+    if (isNeighbour(role))
+        return _strongest.find(role);
+    const Reading* const own = current().readings.find(role);
+    return own ? own : _sides[commonSide].readings.find(role);
+}
+
+const Reading* RadioPicture::find(Role role, RadioTechnology technology) const {
+    return _sides[sideOf(technology)].readings.find(role);
+}
+
+std::optional<RadioMode> RadioPicture::mode() const {
+    if (_technology)
+        return current().mode ? current().mode : _sides[commonSide].mode;
+    if (_sides[commonSide].mode)
+        return _sides[commonSide].mode;
+    const auto isIn = [this](RadioMode mode) {
+        return std::any_of(_sides.begin(), _sides.end(),
+                           [mode](const auto& side) { return side.mode == mode; });
+    };
+    for (const RadioMode each : {RadioMode::Searching, RadioMode::Off})
+        if (isIn(each))
+            return each;
+    return std::nullopt;
+}
+
+CellIdentity RadioPicture::serving() const {
+    CellIdentity cell = identity(_current);
+    cell.area = numberOf(find(Role::ServingArea));
+    const Reading* const country = find(Role::ServingCountryCode);
+    const Reading* const network = find(Role::ServingNetworkCode);
+    if (country && network)
+        cell.network = country->text + '-' + network->text;
+    return cell;
 }
 
 } // namespace velmora

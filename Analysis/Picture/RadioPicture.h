@@ -4,64 +4,35 @@
 #pragma once
 
 #include "Analysis/MessageReport.h"
+#include "Analysis/Picture/CellIdentity.h"
+#include "Analysis/Picture/LeafTable.h"
+#include "Analysis/Picture/LeafUse.h"
+#include "Analysis/Picture/NeighbourCells.h"
+#include "Analysis/Picture/RadioSideState.h"
+#include "Analysis/Picture/RadioTechnology.h"
+#include "Analysis/Picture/Reading.h"
+#include "Analysis/Picture/RoleReadings.h"
+#include "Analysis/Picture/ServingChange.h"
 #include "LogGenerator/Fields/Role.h"
 #include "LogGenerator/Observations/Catalogue.h"
 #include "Platform/Clock.h"
 
-#include <cstddef>
-#include <cstdint>
+#include <array>
+#include <chrono>
 #include <optional>
 #include <span>
-#include <string>
-#include <string_view>
 #include <vector>
 
 namespace velmora {
 
-/// The radio technology of a serving cell.
-enum class RadioTechnology : std::uint8_t { GSM, UMTS, TDSCDMA, LTE, NR, CDMA1x, EVDO };
-
-/// "GSM", "UMTS", "TD-SCDMA", "LTE", "NR", "CDMA2000 1x", "EV-DO".
-[[nodiscard]] std::string_view nameOf(RadioTechnology technology);
-
-/// What the radio-resource layer does, as far as all technologies have it in common.
-enum class RadioMode : std::uint8_t {
-    Off,
-    Searching, ///< no serving cell yet
-    Idle,      ///< camped on a cell
-    Connected, ///< the network moves the phone
-};
-
-/// "off", "searching", "idle", "connected".
-[[nodiscard]] std::string_view nameOf(RadioMode mode);
-
-/// The latest value of a role and where it is from.
-struct Reading {
-    ObservedKind kind = ObservedKind::Absent;
-    double number = 0;     ///< of a number, in the role's unit; the raw number of an enumeration; 0 or 1
-    std::string text;      ///< of an enumeration and a text; the display text of a number is never kept
-    Time time{};           ///< when it was reported
-    Time since{};          ///< since when it has been the same
-    MessageNumber message; ///< that reported it
-    const CatalogueField* leaf = nullptr;
-};
-
-/// A neighbour cell of the latest report that named it.
-struct Neighbour {
-    std::optional<double> channel; ///< as a role's value; absent where the report has none
-    std::optional<double> physicalCell;
-    std::optional<double> level_dBm;
-    std::optional<double> quality_dB;
-    bool isDetected = false; ///< the phone found it by itself: it is in no list of the network's
-    Time time{};
-    MessageNumber message;
-};
-
 /// What the messages of one technology have reported of the radio network: the latest values of the roles, by
 /// the radio technology of the serving cell, and the neighbour cells. A value that the messages withdrew, or
-/// that was of another serving cell, is not in it.
+/// that was of another serving cell, is not in it; a damaged message changes nothing.
 class RadioPicture {
 public:
+    /// A serving cell that no message has reported anything of for so long is not known any more.
+    static constexpr std::chrono::seconds servingLifetime{5};
+
     /// The catalogue, which may grow, must outlive it.
     explicit RadioPicture(const Catalogue& catalogue);
 
@@ -70,20 +41,62 @@ public:
     void clear();
 
     [[nodiscard]] const Catalogue& catalogue() const { return _catalogue; }
-    /// Null where it is not known. For the roles of neighbours that of the strongest one.
+    /// Null where it is not known. For the roles of neighbours that of the strongest one of the serving
+    /// cell's radio technology.
     [[nodiscard]] const Reading* find(Role role) const;
+    /// The same of that radio technology, where the phone has a serving cell of several: null where it has
+    /// none.
+    [[nodiscard]] const Reading* find(Role role, RadioTechnology technology) const;
     /// The strongest first; those without a level last.
-    [[nodiscard]] std::span<const Neighbour> neighbours() const { return _neighbours; }
+    [[nodiscard]] std::span<const Neighbour> neighbours() const { return _neighbours.cells(); }
     /// Absent where no message has reported it.
     [[nodiscard]] std::optional<RadioTechnology> technology() const { return _technology; }
-    [[nodiscard]] std::optional<RadioMode> mode() const { return _mode; }
+    [[nodiscard]] std::optional<RadioMode> mode() const;
+    [[nodiscard]] CellIdentity serving() const;
+    /// Set where the latest message reported another serving cell; null otherwise.
+    [[nodiscard]] const ServingChange* servingChange() const { return _change ? &*_change : nullptr; }
+    /// Whether the phone has serving cells of several radio technologies at the same time.
+    [[nodiscard]] bool isHybrid() const { return _table.isHybrid; }
 
 private:
+    const LeafUse& useOf(const CatalogueField& leaf);
+    /// Notes what the message says of serving cells and neighbours, before any of it is kept.
+    void gather(const MessageReport& report);
+    void gatherRow(const Observation& observation, RadioSideState& side);
+    void forgetOld(Time now);
+    void forgetWithdrawn(const ObservedMessage& message);
+    void change(const MessageReport& report);
+    void keep(const MessageReport& report);
+    void keepMode(const Observation& observation, const LeafUse& use, Time now);
+    /// Forgets what was in a list of serving cells that the message replaced.
+    void forgetReplaced(const MessageReport& report);
+    void forgetCell(RadioSide side);
+    [[nodiscard]] bool reportsCells(const RadioSideState& side) const;
+    void findCurrent();
+    void findStrongest();
+    [[nodiscard]] RadioSideState& current() { return _sides[_current]; }
+    [[nodiscard]] const RadioSideState& current() const { return _sides[_current]; }
+    [[nodiscard]] CellIdentity identity(RadioSide side) const;
+
     const Catalogue& _catalogue;
-    std::vector<std::optional<Reading>> _roles; ///< by role
-    std::vector<Neighbour> _neighbours;
+    const TechnologyTable& _table;
+    LeafTable<LeafUse> _uses;
+    std::array<RadioSideState, radioSides> _sides;
+    NeighbourCells _neighbours;
+    RoleReadings _strongest; ///< the strongest neighbour's
     std::optional<RadioTechnology> _technology;
-    std::optional<RadioMode> _mode;
+    std::optional<RadioTechnology> _named; ///< the radio technology that the message names
+    RadioSide _current = commonSide;       ///< of the serving cell
+    std::optional<ServingChange> _change;
+    ObservedText _text;
+    /// The lists of serving cells, as far as they have been seen.
+    struct ServingList {
+        const CatalogueNode* list;
+        RadioSide side;
+        Role role;
+        friend bool operator==(const ServingList&, const ServingList&) = default;
+    };
+    std::vector<ServingList> _servingLists;
 };
 
 } // namespace velmora

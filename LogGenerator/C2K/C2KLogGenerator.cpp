@@ -144,17 +144,26 @@ void C2KLogGenerator::decode(const Data& data, const std::optional<LogMessage>& 
                              const DictionaryRef& lookup, Dictionary& state, MessageEffects* effects) {
     if (effects)
         effects->values(message ? std::optional(message->logCode()) : std::nullopt);
-    if (!message)
+    if (!message) {
+        if (observer())
+            observer()->damaged(Damage::NoRecord);
         return;
+    }
     // On purpose the record is decoded although the line says "Dropping"; only the codes of the extra stream,
     // for which the line is written as well, match no parser.
-    if (message->type != LogMessage::basebandType)
+    if (message->type != LogMessage::basebandType) {
         logFormat(LogPriority::Error, "Invalid log type: %x. Dropping.",
                   static_cast<unsigned>(message->type));
+        if (observer())
+            observer()->damaged(Damage::WrongType);
+    }
     const C2K::LogCodeParser* const parser = C2K::parserOfCode(message->logCode());
     if (!parser)
         return;
-    if (const std::optional<C2K::Reading> reading = parser->accept(Record(message->record), state)) {
+    const std::optional<C2K::Reading> reading = parser->accept(Record(message->record), state);
+    if (observer() && (!reading || reading->isIncomplete))
+        observer()->damaged(Damage::TooShort);
+    if (reading) {
         if (effects) {
             EffectsVisitor visitor(*effects);
             parser->decode(*reading, visitor);

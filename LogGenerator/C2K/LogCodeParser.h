@@ -21,6 +21,7 @@ struct Reading {
     Record record = Record(Bytes());
     std::optional<double> number = std::nullopt;
     KeptRecords::Parts parts = 1; ///< the groups of values that the reading publishes, a bit each
+    bool isIncomplete = false;    ///< the record ends before something that it must have
 
     static constexpr std::size_t mostParts = 2;
 };

@@ -30,10 +30,12 @@ void CellSection::updateWithData(const Data& data, std::uint32_t logCode) {
 void CellSection::updateCells(const Data& data) {
     const bool isList = cellTable().shown == CellTable::Shown::Rows;
     _selected.clear();
-    if (const std::vector<Cell>* const cells = _cells->read(data))
+    if (const std::vector<Cell>* const cells = _cells->read(data)) {
         select(*cells);
-    else
+    } else {
+        observeDamage(Damage::Unreadable);
         noCells();
+    }
     if (_selected.empty() && !isList)
         return; // what is shown of an earlier cell stays
     const View* const view = viewOf(cellInformation.code);

@@ -45,7 +45,9 @@ void PDPContextList::trace() const {
 void PDPContextList::updateWithData(const Data& data, std::uint32_t) {
     trace();
     const ContextListReader reader(data, _payloads);
-    if (reader.contexts().asArray())
+    if (!reader.contexts().asArray())
+        observeDamage(Damage::Unreadable);
+    else
         keep(contextViews[0], Record(Bytes()), 1, [this, &reader] { _contexts = reader.contexts(); });
 }
 

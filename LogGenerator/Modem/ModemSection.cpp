@@ -30,6 +30,7 @@ Value ModemSection::read(const Data& data, std::uint32_t logCode) const {
     const Result<Value> payload = _payloads->read(data);
     if (payload && payload->asDictionary())
         return *payload;
+    observeDamage(Damage::Unreadable);
     if (reportsErrors()) {
         const std::string why =
             payload ? "the root is of kind " + std::string(nameOf(payload->kind())) + ", wanted a dictionary"

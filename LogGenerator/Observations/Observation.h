@@ -5,6 +5,7 @@
 
 #include "LogGenerator/Fields/Field.h"
 #include "LogGenerator/Observations/Catalogue.h"
+#include "LogGenerator/Observations/Damage.h"
 #include "Platform/Bytes.h"
 #include "Platform/Clock.h"
 
@@ -72,6 +73,7 @@ struct ObservedMessage {
     std::span<const ObservedList> lists;
     /// Leaves that show nothing any more.
     std::span<const CatalogueField* const> removed;
+    Damage damage = Damage::None; ///< the first that the decoder found; what is readable was observed
 };
 
 /// Gets what each message reported, when it has been decoded. Called for every message.

@@ -14,6 +14,7 @@ namespace velmora {
 
 void Observer::beginMessage() {
     ++_messages;
+    _damage = Damage::None;
     _map = nullptr;
     _sections.clear();
     _observations.clear();
@@ -39,7 +40,7 @@ ObservedMessage Observer::message(Time arrival, std::optional<std::uint32_t> cod
                                   std::optional<std::uint64_t> timestamp) const {
     for (const auto& [map, recordCode] : _sections)
         map->setLatestRecord(arrival);
-    return {_messages, arrival, code, timestamp, _observations, _lists, _removed};
+    return {_messages, arrival, code, timestamp, _observations, _lists, _removed, _damage};
 }
 
 Observation& Observer::add(const CatalogueField& leaf, const CatalogueSource* source) {

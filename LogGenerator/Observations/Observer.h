@@ -29,6 +29,11 @@ public:
     /// The fields of a section follow, from a record of that code. False where the section has named that
     /// record's fields already: a code that is subscribed twice is observed once.
     [[nodiscard]] bool beginSection(const FieldMap& map, std::uint32_t code);
+    /// The decoder found the message malformed. The first damage of a message counts.
+    void damaged(Damage damage) {
+        if (_damage == Damage::None)
+            _damage = damage;
+    }
     /// All of the message, as it arrived at that time, which is that of its sections' latest record.
     [[nodiscard]] ObservedMessage message(Time arrival, std::optional<std::uint32_t> code,
                                           std::optional<std::uint64_t> timestamp) const;
@@ -87,6 +92,7 @@ private:
     void leaf(const CatalogueField& leaf, const Value& value);
 
     std::uint64_t _messages = 0;
+    Damage _damage = Damage::None; ///< of this message
     const FieldMap* _map = nullptr;
     std::uint32_t _code = 0; ///< of the record whose fields are named
     std::vector<std::pair<const FieldMap*, std::uint32_t>> _sections; ///< of this message

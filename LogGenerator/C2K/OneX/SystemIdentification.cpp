@@ -97,7 +97,7 @@ std::optional<Reading> SystemIdentification::accept(const Record& record, Dictio
     logFormat(LogPriority::Error,
               "Log code 0x134f is %d bytes long but must be at least %lu bytes for the base station id.",
               static_cast<int>(record.size()), static_cast<unsigned long>(endOf(baseStation, true)));
-    return Reading{record, std::nullopt, identification};
+    return Reading{record, std::nullopt, identification, true};
 }
 
 void SystemIdentification::decode(const Reading& reading, FieldVisitor& visitor) const {

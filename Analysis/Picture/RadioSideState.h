@@ -1,0 +1,50 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include "Analysis/Picture/CellIdentity.h"
+#include "Analysis/Picture/RadioTechnology.h"
+#include "Analysis/Picture/RoleReadings.h"
+
+#include <cstdint>
+#include <optional>
+
+namespace velmora {
+
+/// What the picture knows of one radio technology.
+struct RadioSideState {
+    RoleReadings readings;
+    std::optional<RadioTechnology> technology; ///< of the serving cell
+    std::optional<RadioMode> mode;
+    std::optional<bool> isMovedByNetwork;
+    bool isReported = false; ///< whether anything is known of a serving cell
+    Time reported{};         ///< when a message last reported anything of it
+    Time modeReported{};
+    MessageNumber message; ///< that did
+
+    // Of the current message:
+    std::optional<RadioMode> modeBefore;
+    std::optional<bool> wasMovedByNetwork;
+    bool isServing = false;              ///< whether it reports anything of a serving cell
+    CellIdentity found;                  ///< the cell that it reports
+    const CatalogueNode* list = nullptr; ///< of serving cells, of which it found the row
+    std::uint32_t row = 0;
+
+    void setMode(std::optional<RadioMode> newMode, bool byNetwork) {
+        mode = newMode;
+        // Without a cell there is nothing to move from.
+        const bool hasCell = mode == RadioMode::Idle || mode == RadioMode::Connected;
+        isMovedByNetwork = hasCell ? std::optional(byNetwork) : std::nullopt;
+    }
+
+    void beginMessage() {
+        modeBefore = mode;
+        wasMovedByNetwork = isMovedByNetwork;
+        isServing = false;
+        found.cell.reset(), found.channel.reset(), found.physicalCell.reset();
+        list = nullptr;
+    }
+};
+
+} // namespace velmora
