@@ -34,9 +34,14 @@ void addBound(CLI::App& command, const std::string& name, std::optional<TimeBoun
 
 } // namespace
 
+void addRange(CLI::App& command, TimeRange& range, const std::string& from, const std::string& to) {
+    addBound(command, "--from", range.from, from);
+    addBound(command, "--to", range.to, to);
+}
+
 void addSelection(CLI::App& command, MessageSelection& selection, const std::string& cold) {
-    addBound(command, "--from", selection.range.from, "Only messages at or after this time" + cold);
-    addBound(command, "--to", selection.range.to, "Only messages before this time");
+    addRange(command, selection.range, "Only messages at or after this time" + cold,
+             "Only messages before this time");
     command
         .add_option_function<std::vector<std::string>>(
             "--code",

@@ -17,6 +17,10 @@ namespace velmora {
 /// without what earlier messages leave. Parsing fills `selection`, which must outlive `command`.
 void addSelection(CLI::App& command, MessageSelection& selection, const std::string& cold);
 
+/// Adds `--from` and `--to` alone, with these descriptions. Parsing fills `range`, which must outlive
+/// `command`.
+void addRange(CLI::App& command, TimeRange& range, const std::string& from, const std::string& to);
+
 /// What a TIME is, for the command's footer.
 inline constexpr const char* timeHelp =
     "A TIME is ISO 8601 (UTC unless it has a zone), seconds since 1970, or +SECONDS after the file's\n"

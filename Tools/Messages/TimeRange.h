@@ -39,8 +39,7 @@ struct TimeRange {
         return (!from || message >= momentOf(*from, first)) && (!to || message < momentOf(*to, first));
     }
 
-private:
-    /// Clamped to the range of Time.
+    /// The time that a bound denotes, clamped to the range of Time.
     [[nodiscard]] static Time momentOf(const TimeBound& bound, Time first);
 };
 
