@@ -7,9 +7,11 @@
 #include "Platform/SystemLog.h"
 #include "Tools/Convert/ConvertOptions.h"
 #include "Tools/Decode/DecodeOptions.h"
+#include "Tools/Diff/DiffOptions.h"
 #include "Tools/Fields/FieldsOptions.h"
 #include "Tools/Info/InfoOptions.h"
 #include "Tools/Record/RecordOptions.h"
+#include "Tools/Stats/StatsOptions.h"
 #include "Tools/Watch/WatchOptions.h"
 
 #include <string>
@@ -30,7 +32,7 @@ struct CommandLine {
     bool verbose =
         false; ///< decoder lines as they arise, not summed up; those of objects made and destroyed too
     std::variant<Notice, DecodeOptions, WatchOptions, RecordOptions, ConvertOptions, InfoOptions,
-                 FieldsOptions>
+                 FieldsOptions, StatsOptions, DiffOptions>
         command;
 };
 

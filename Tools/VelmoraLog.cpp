@@ -9,6 +9,7 @@
 #include "Tools/CommandLine.h"
 #include "Tools/Convert/ConvertCommand.h"
 #include "Tools/Decode/DecodeCommand.h"
+#include "Tools/Diff/DiffCommand.h"
 #include "Tools/ExitStatus.h"
 #include "Tools/Fields/FieldsCommand.h"
 #include "Tools/Info/InfoCommand.h"
@@ -17,6 +18,7 @@
 #include "Tools/Output.h"
 #include "Tools/Record/RecordCommand.h"
 #include "Tools/Report.h"
+#include "Tools/Stats/StatsCommand.h"
 #include "Tools/Watch/WatchCommand.h"
 
 #include <csignal>
@@ -46,6 +48,10 @@ int run(const CommandLine& line, DecoderLines& lines, Output& output) {
         return runWatch(*watch, lines, output);
     if (const auto* record = std::get_if<RecordOptions>(&line.command))
         return runRecord(*record, lines);
+    if (const auto* stats = std::get_if<StatsOptions>(&line.command))
+        return runStats(*stats, lines, output);
+    if (const auto* diff = std::get_if<DiffOptions>(&line.command))
+        return runDiff(*diff, lines, output);
     const DecoderLog log(lines);
     if (const auto* info = std::get_if<InfoOptions>(&line.command))
         return runInfo(*info, output);
