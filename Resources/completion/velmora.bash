@@ -106,7 +106,7 @@ _velmora_log() {
     for ((i = 1; i < cword; ++i)); do
         case ${words[i]} in
         --log | --log-level | --format | --every | --select | --from | --to | --code | --technology | --jobs | \
-            --max-age | --duration | --count | --timeout | --description | --role)
+            --max-age | --duration | --count | --timeout | --description | --role | --by | --clock)
             ((++i))
             ;;
         -?*) ;;
@@ -122,8 +122,8 @@ _velmora_log() {
     case $prev in
     --format)
         case $command in
-        info) _velmora_offer text json ;;
-        fields) _velmora_offer text json csv ;;
+        info | diff) _velmora_offer text json ;;
+        fields | stats) _velmora_offer text json csv ;;
         *) _velmora_offer text json jsonl csv ;;
         esac
         return
@@ -134,6 +134,14 @@ _velmora_log() {
         ;;
     --every)
         _velmora_offer refresh message
+        return
+        ;;
+    --by)
+        _velmora_offer file technology cell minute
+        return
+        ;;
+    --clock)
+        _velmora_offer arrival modem
         return
         ;;
     --technology)
@@ -156,7 +164,7 @@ _velmora_log() {
         if [[ $cur == -* ]]; then
             _velmora_offer "${options[@]}" --version
         else
-            _velmora_offer decode watch record convert info fields
+            _velmora_offer decode watch record convert info fields stats diff
         fi
         return
         ;;
@@ -166,6 +174,8 @@ _velmora_log() {
     convert) options+=(--force --from --to --code --technology --description --strict) ;;
     info) options+=(--format --technology) ;;
     fields) options+=(--technology --role --format --safe) ;;
+    stats) options+=(--format --safe --histogram --by --select --role --from --to --clock --technology) ;;
+    diff) options+=(--format --display --select --role --clock --technology) ;;
     esac
     if [[ $cur == -* ]]; then
         _velmora_offer "${options[@]}"
@@ -173,7 +183,7 @@ _velmora_log() {
     fi
     # As many files as the command takes.
     case $command:$files in
-    decode:* | info:* | record:0 | convert:[01]) _filedir '@(pcapng|velmora|dlf)' ;;
+    decode:* | info:* | stats:* | record:0 | convert:[01] | diff:[01]) _filedir '@(pcapng|velmora|dlf)' ;;
     esac
 }
 
