@@ -14,7 +14,7 @@ const std::string state = "/Radio/State";
 
 class StateTimesTest : public testing::Test {
 protected:
-    StateTimesTest() {
+    void SetUp() override {
         statistics.complete = [this](const GroupStatistics& group) { lines = stateLines(group, state); };
     }
     void report(double seconds, const std::string& value) {
