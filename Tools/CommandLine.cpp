@@ -25,9 +25,11 @@ std::string usageError(const CLI::App& app, const CLI::ParseError& error) {
         return error.what();
     const std::vector<std::string> rest = app.remaining();
     if (rest.empty())
-        return "no command, wanted decode, watch, record, convert, info, fields, stats or diff";
+        return "no command, wanted decode, watch, record, convert, info, fields, events, rules, stats or "
+               "diff";
     return "got " + rest.front() +
-           ", wanted one of the commands decode, watch, record, convert, info, fields, stats and diff";
+           ", wanted one of the commands decode, watch, record, convert, info, fields, events, rules, stats "
+           "and diff";
 }
 
 } // namespace
@@ -55,7 +57,7 @@ CommandLine parseCommandLine(int count, const char* const* arguments) {
     app.add_flag("-v,--verbose", line.verbose,
                  "Write each log line of a decoder as it arises, not their sum at the end, and those that "
                  "report its start and end");
-    app.footer("Exit status: 0 done, 1 the input was bad, 2 usage.\n\n"
+    app.footer("Exit status: 0 done, 1 the input was bad, 2 usage, 3 see events --fail-on.\n\n"
                "Examples:\n"
                "  velmora-log watch\n"
                "  velmora-log record drive.pcapng\n"
@@ -68,6 +70,8 @@ CommandLine parseCommandLine(int count, const char* const* arguments) {
     ConvertOptions convert;
     InfoOptions info;
     FieldsOptions fields;
+    EventsOptions events;
+    RulesOptions rules;
     StatsOptions stats;
     DiffOptions diff;
     const CLI::App* decodeCommand = addDecode(app, decode);
@@ -76,6 +80,8 @@ CommandLine parseCommandLine(int count, const char* const* arguments) {
     const CLI::App* convertCommand = addConvert(app, convert);
     const CLI::App* infoCommand = addInfo(app, info);
     const CLI::App* fieldsCommand = addFields(app, fields);
+    const CLI::App* eventsCommand = addEvents(app, events);
+    const CLI::App* rulesCommand = addRules(app, rules);
     const CLI::App* statsCommand = addStats(app, stats);
     addDiff(app, diff);
 
@@ -104,6 +110,10 @@ CommandLine parseCommandLine(int count, const char* const* arguments) {
         line.command = info;
     else if (fieldsCommand->parsed())
         line.command = fields;
+    else if (eventsCommand->parsed())
+        line.command = events;
+    else if (rulesCommand->parsed())
+        line.command = rules;
     else if (statsCommand->parsed())
         line.command = stats;
     else

@@ -10,6 +10,7 @@
 #include "Tools/Convert/ConvertCommand.h"
 #include "Tools/Decode/DecodeCommand.h"
 #include "Tools/Diff/DiffCommand.h"
+#include "Tools/Events/EventsCommand.h"
 #include "Tools/ExitStatus.h"
 #include "Tools/Fields/FieldsCommand.h"
 #include "Tools/Info/InfoCommand.h"
@@ -18,6 +19,7 @@
 #include "Tools/Output.h"
 #include "Tools/Record/RecordCommand.h"
 #include "Tools/Report.h"
+#include "Tools/Rules/RulesCommand.h"
 #include "Tools/Stats/StatsCommand.h"
 #include "Tools/Watch/WatchCommand.h"
 
@@ -48,6 +50,8 @@ int run(const CommandLine& line, DecoderLines& lines, Output& output) {
         return runWatch(*watch, lines, output);
     if (const auto* record = std::get_if<RecordOptions>(&line.command))
         return runRecord(*record, lines);
+    if (const auto* events = std::get_if<EventsOptions>(&line.command))
+        return runEvents(*events, lines, output);
     if (const auto* stats = std::get_if<StatsOptions>(&line.command))
         return runStats(*stats, lines, output);
     if (const auto* diff = std::get_if<DiffOptions>(&line.command))
@@ -57,6 +61,8 @@ int run(const CommandLine& line, DecoderLines& lines, Output& output) {
         return runInfo(*info, output);
     if (const auto* fields = std::get_if<FieldsOptions>(&line.command))
         return runFields(*fields, output);
+    if (const auto* rules = std::get_if<RulesOptions>(&line.command))
+        return runRules(*rules, output);
     return runConvert(std::get<ConvertOptions>(line.command));
 }
 

@@ -3,29 +3,49 @@
 
 #include "Analysis/Engine/EventEngine.h"
 
+#include "Analysis/Detectors/BuiltIn.h"
+
 #include <utility>
 
 namespace velmora {
 
-EventEngine::EventEngine(const Catalogue& catalogue, EventSink& sink) : _picture(catalogue), _sink(sink) {}
+EventEngine::EventEngine(const Catalogue& catalogue, EventSink& sink)
+    : _picture(catalogue), _sink(sink), _checks(catalogue.technology(), sink),
+      _detectors(builtInDetectors(catalogue)) {}
 
 void EventEngine::add(std::unique_ptr<Detector> detector) {
     _detectors.push_back(std::move(detector));
 }
 
 void EventEngine::report(const MessageReport& report) {
-    _last = report.time;
+    if (_checks.isInterruption(report))
+        interrupt();
+    _checks.report(report);
+    // A malformed message may state anything.
+    if (report.observed.damage != Damage::None)
+        return;
     _picture.update(report);
     for (const auto& each : _detectors)
         each->report(report, _picture, _sink);
 }
 
+void EventEngine::damaged(MessageNumber message, std::string_view reason) {
+    interrupt();
+    _checks.damaged(message, reason);
+}
+
+void EventEngine::interrupt() {
+    _picture.clear();
+    if (const std::optional<Time> last = _checks.last())
+        for (const auto& each : _detectors)
+            each->interrupt(*last, _sink);
+}
+
 void EventEngine::finish() {
-    if (!_last)
-        return;
-    for (const auto& each : _detectors)
-        each->finish(*_last, _sink);
-    _last.reset();
+    if (const std::optional<Time> last = _checks.last())
+        for (const auto& each : _detectors)
+            each->finish(*last, _sink);
+    _checks.finish();
 }
 
 } // namespace velmora

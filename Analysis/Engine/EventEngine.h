@@ -4,13 +4,14 @@
 #pragma once
 
 #include "Analysis/Engine/Detector.h"
+#include "Analysis/Engine/RecordingChecks.h"
 #include "Analysis/Events/EventSink.h"
 #include "Analysis/MessageReport.h"
 #include "Analysis/Picture/RadioPicture.h"
 #include "LogGenerator/Observations/Catalogue.h"
 
 #include <memory>
-#include <optional>
+#include <string_view>
 #include <vector>
 
 namespace velmora {
@@ -24,11 +25,16 @@ public:
     EventEngine(const EventEngine&) = delete;
     EventEngine& operator=(const EventEngine&) = delete;
 
-    /// Adds one that gets all further messages, after the earlier ones.
+    /// Adds one that gets all further messages but malformed ones, after the earlier detectors.
     void add(std::unique_ptr<Detector> detector);
 
     /// The next message.
     void report(const MessageReport& report);
+    /// The reader of the input found damage, such as a record of the file that is not whole, before the
+    /// message of that number. Messages may be missing: what was known is not valid any more.
+    void damaged(MessageNumber message, std::string_view reason);
+    /// The connection that messages come by was lost: as damage, but no event.
+    void interrupt();
     /// The input has ended.
     void finish();
 
@@ -38,8 +44,8 @@ public:
 private:
     RadioPicture _picture;
     EventSink& _sink;
+    RecordingChecks _checks;
     std::vector<std::unique_ptr<Detector>> _detectors;
-    std::optional<Time> _last;
 };
 
 } // namespace velmora

@@ -36,10 +36,10 @@ void RadioPicture::update(const MessageReport& report) {
     _change.reset();
     if (report.observed.damage != Damage::None)
         return;
-    gather(report);
     forgetOld(report.time);
-    forgetWithdrawn(report.observed);
+    gather(report);
     change(report);
+    forgetWithdrawn(report.observed);
     keep(report);
     forgetReplaced(report);
     findCurrent();
@@ -68,6 +68,9 @@ void RadioPicture::gather(const MessageReport& report) {
             continue;
         RadioSideState& side = _sides[use.side];
         side.isServing = true;
+        if (use.role == Role::ServingArea && each.kind == ObservedKind::Number)
+            side.hasNoArea = std::find(_table.noAreas.begin(), _table.noAreas.end(),
+                                       static_cast<std::int64_t>(each.number)) != _table.noAreas.end();
         if (use.list && use.role == Role::ServingPhysicalCell)
             gatherRow(each, side);
         if (use.list)
@@ -95,6 +98,7 @@ void RadioPicture::gatherRow(const Observation& observation, RadioSideState& sid
 void RadioPicture::forgetCell(RadioSide side) {
     _sides[side].readings.forgetServing();
     _sides[side].isReported = false;
+    _sides[side].before.reset(), _sides[side].since.reset();
     _sides[commonSide].readings.forgetServing(); // its network and area
 }
 
@@ -132,6 +136,8 @@ CellIdentity RadioPicture::identity(RadioSide side) const {
 }
 
 bool RadioPicture::reportsCells(const RadioSideState& side) const {
+    if (side.hasNoArea)
+        return false;
     return !_table.hasCellInUseAlone || side.mode == RadioMode::Idle || side.mode == RadioMode::Connected;
 }
 
@@ -146,13 +152,17 @@ void RadioPicture::change(const MessageReport& report) {
         RadioSideState& old = _sides[before];
         const CellIdentity known = identity(before);
         if (known.isKnown() && areSameCell(known, side.found) == false) {
-            const bool isModeKnown = old.modeBefore.has_value();
+            // A message that reports both shows the mode in which the phone came to the cell.
+            const bool isModeKnown = old.modeBefore.has_value() && !side.isModeReported;
             _change = ServingChange{known,
                                     side.found,
                                     isModeKnown ? old.modeBefore : side.mode,
                                     isModeKnown ? old.wasMovedByNetwork : side.isMovedByNetwork,
                                     numberOf(old.readings.find(Role::ServingLevel)),
-                                    old.message};
+                                    old.message,
+                                    old.before,
+                                    old.since,
+                                    old.firstOfCell};
             forgetCell(before);
             _neighbours.forgetAll();
             if (isOtherSide)
@@ -160,6 +170,11 @@ void RadioPicture::change(const MessageReport& report) {
         }
         if (isOtherSide && _change && side.modeBefore == side.mode)
             side.setMode({}, false); // of an earlier time on this technology
+        if (_change && !side.since) {
+            side.before = _change->from;
+            side.since = report.time;
+            side.firstOfCell = report.message;
+        }
         if (!_table.isHybrid) {
             _current = i;
             _technology = side.found.technology;
@@ -201,6 +216,7 @@ void RadioPicture::forgetReplaced(const MessageReport& report) {
 
 void RadioPicture::keepMode(const Observation& observation, const LeafUse& use, Time now) {
     RadioSideState& side = _sides[use.side];
+    side.isModeReported = true;
     if (use.evidence) {
         if (observation.kind != ObservedKind::Absent) {
             side.setMode(use.evidence->mode, use.evidence->mode == RadioMode::Connected);
@@ -224,6 +240,9 @@ void RadioPicture::keepMode(const Observation& observation, const LeafUse& use, 
 }
 
 void RadioPicture::findCurrent() {
+    for (RadioSide i = 0; i < radioSides; ++i)
+        if (_sides[i].isReported && !identity(i).isKnown())
+            forgetCell(i); // it was withdrawn
     if (_table.isHybrid) {
         const RadioSideState& data = _sides[sideOf(RadioTechnology::EVDO)];
         const RadioSideState& voice = _sides[sideOf(RadioTechnology::CDMA1x)];
@@ -251,6 +270,7 @@ void RadioPicture::clear() {
         each.readings.forgetAll();
         each.setMode({}, false);
         each.isReported = false;
+        each.before.reset(), each.since.reset();
     }
     _neighbours.forgetAll();
     _strongest.forgetAll();

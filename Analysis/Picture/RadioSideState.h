@@ -21,12 +21,17 @@ struct RadioSideState {
     bool isReported = false; ///< whether anything is known of a serving cell
     Time reported{};         ///< when a message last reported anything of it
     Time modeReported{};
-    MessageNumber message; ///< that did
+    std::optional<CellIdentity> before; ///< the serving cell before this one
+    std::optional<Time> since;          ///< when this one became it; only where a change was seen
+    MessageNumber firstOfCell;          ///< the message that reported the change
+    MessageNumber message;              ///< that did
 
     // Of the current message:
     std::optional<RadioMode> modeBefore;
     std::optional<bool> wasMovedByNetwork;
-    bool isServing = false;              ///< whether it reports anything of a serving cell
+    bool isServing = false; ///< whether it reports anything of a serving cell
+    bool isModeReported = false;
+    bool hasNoArea = false;              ///< the area that it reports stands for none
     CellIdentity found;                  ///< the cell that it reports
     const CatalogueNode* list = nullptr; ///< of serving cells, of which it found the row
     std::uint32_t row = 0;
@@ -41,7 +46,7 @@ struct RadioSideState {
     void beginMessage() {
         modeBefore = mode;
         wasMovedByNetwork = isMovedByNetwork;
-        isServing = false;
+        isServing = isModeReported = hasNoArea = false;
         found.cell.reset(), found.channel.reset(), found.physicalCell.reset();
         list = nullptr;
     }

@@ -21,6 +21,10 @@ struct ServingChange {
     std::optional<bool> isMovedByNetwork;
     std::optional<double> level_dBm; ///< of the cell that it left, as last reported
     MessageNumber lastOfOld;         ///< the last message that reported anything of that cell
+    // Where it has been known since the phone came to that cell:
+    std::optional<CellIdentity> before; ///< the cell that it had left for it
+    std::optional<Time> since;          ///< when it came
+    MessageNumber firstOfOld;           ///< the message that reported that
 };
 
 } // namespace velmora

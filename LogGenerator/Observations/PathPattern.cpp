@@ -69,22 +69,6 @@ bool leadsInto(std::string_view rest, const Node& node, bool atRoot) {
     return false;
 }
 
-/// How many characters have to be inserted, removed or replaced to make one text the other.
-std::size_t distance(std::string_view a, std::string_view b) {
-    std::vector<std::size_t> row(b.size() + 1);
-    std::iota(row.begin(), row.end(), std::size_t{0});
-    for (std::size_t i = 0; i < a.size(); ++i) {
-        std::size_t diagonal = row[0];
-        row[0] = i + 1;
-        for (std::size_t j = 0; j < b.size(); ++j) {
-            const std::size_t replaced = diagonal + (a[i] == b[j] ? 0 : 1);
-            diagonal = row[j + 1];
-            row[j + 1] = std::min({replaced, row[j] + 1, row[j + 1] + 1});
-        }
-    }
-    return row.back();
-}
-
 void collectPaths(const Node& node, std::vector<std::string>& paths) {
     for (const auto& child : node.children()) {
         paths.push_back(child->path());
@@ -140,13 +124,28 @@ bool isInRows(const Observation& observation, const PathPattern::Rows& rows) {
     return true;
 }
 
+std::size_t editDistance(std::string_view a, std::string_view b) {
+    std::vector<std::size_t> row(b.size() + 1);
+    std::iota(row.begin(), row.end(), std::size_t{0});
+    for (std::size_t i = 0; i < a.size(); ++i) {
+        std::size_t diagonal = row[0];
+        row[0] = i + 1;
+        for (std::size_t j = 0; j < b.size(); ++j) {
+            const std::size_t replaced = diagonal + (a[i] == b[j] ? 0 : 1);
+            diagonal = row[j + 1];
+            row[j + 1] = std::min({replaced, row[j] + 1, row[j + 1] + 1});
+        }
+    }
+    return row.back();
+}
+
 std::vector<std::string> nearestPaths(std::span<const Catalogue* const> catalogues, std::string_view path) {
     std::vector<std::string> paths;
     for (const Catalogue* const catalogue : catalogues)
         collectPaths(catalogue->root(), paths);
     std::vector<std::pair<std::size_t, std::size_t>> ranks;
     for (std::size_t i = 0; i < paths.size(); ++i)
-        ranks.emplace_back(distance(path, paths[i]), i);
+        ranks.emplace_back(editDistance(path, paths[i]), i);
     std::sort(ranks.begin(), ranks.end());
     std::vector<std::string> nearest;
     for (const auto& [far, index] : ranks)

@@ -6,6 +6,7 @@
 #include "LogGenerator/Observations/Catalogue.h"
 #include "LogGenerator/Observations/Observation.h"
 
+#include <cstddef>
 #include <cstdint>
 #include <optional>
 #include <span>
@@ -47,6 +48,9 @@ private:
 
 /// Whether the observation is in such rows.
 [[nodiscard]] bool isInRows(const Observation& observation, const PathPattern::Rows& rows);
+
+/// How many characters have to be inserted, removed or replaced to make one text the other.
+[[nodiscard]] std::size_t editDistance(std::string_view a, std::string_view b);
 
 /// The paths of leaves and of what they are in that most resemble the path, the nearest first: at most
 /// three of all catalogues.

@@ -90,9 +90,11 @@ void RRC_State::updateWithData(const Data& data, std::uint32_t logCode) {
 
 void RRC_State::check(const View&, const Record& record) const {
     // The warning does not stop the decoding, on purpose.
-    if (record.size() < expectedLength)
-        logFormat(LogPriority::Warning, "LogCode_0xD0E0 is length is %ld expected size %ld",
-                  static_cast<long>(record.size()), static_cast<long>(expectedLength));
+    if (record.size() >= expectedLength)
+        return;
+    observeDamage(Damage::TooShort);
+    logFormat(LogPriority::Warning, "LogCode_0xD0E0 is length is %ld expected size %ld",
+              static_cast<long>(record.size()), static_cast<long>(expectedLength));
 }
 
 void RRC_State::decode(const View&, const Record& record, FieldVisitor& visitor) const {

@@ -31,14 +31,29 @@ FileSource::~FileSource() {
         ::close(_descriptor);
 }
 
+bool FileSource::wait() const {
+    constexpr int interval_ms = 50;
+    pollfd readable{_descriptor, POLLIN, 0};
+    if (::poll(&readable, 1, 0) != 0)
+        return true;
+    if (_hooks.beforeWaiting)
+        _hooks.beforeWaiting();
+    if (!_hooks.whileWaiting)
+        return true;
+    int ready = 0;
+    do {
+        if (!_hooks.whileWaiting())
+            return false;
+        ready = ::poll(&readable, 1, interval_ms);
+    } while (ready == 0 || (ready < 0 && errno == EINTR));
+    return true;
+}
+
 Result<std::size_t> FileSource::read(std::span<std::uint8_t> buffer) {
     if (_hooks.mayRead && !_hooks.mayRead(_offset))
         return Failure{"interrupted"};
-    if (_hooks.beforeWaiting) {
-        pollfd readable{_descriptor, POLLIN, 0};
-        if (::poll(&readable, 1, 0) == 0)
-            _hooks.beforeWaiting();
-    }
+    if ((_hooks.beforeWaiting || _hooks.whileWaiting) && !wait())
+        return Failure{"interrupted"};
     for (;;) {
         const ssize_t count = ::read(_descriptor, buffer.data(), buffer.size());
         if (count >= 0) {

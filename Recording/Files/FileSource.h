@@ -19,6 +19,8 @@ public:
     struct Hooks {
         /// Nothing is there to be read, as on a pipe whose writer has paused.
         std::function<void()> beforeWaiting = {};
+        /// At least every 50 ms while nothing is there; false ends the input with a failure.
+        std::function<bool()> whileWaiting = {};
         /// Before each read, with the bytes so far; false ends the input with a failure. A damaged file may
         /// be read for long without a message.
         std::function<bool(std::uint64_t offset)> mayRead = {};
@@ -39,6 +41,9 @@ public:
     Result<std::size_t> read(std::span<std::uint8_t> buffer) override;
 
 private:
+    /// Until there is something to read. False where the input is to end.
+    [[nodiscard]] bool wait() const;
+
     int _descriptor;
     bool _owned;
     Hooks _hooks;

@@ -8,6 +8,11 @@ _velmora_technologies=(IFX Ostrel_GSM Ostrel_CDMA Ostrel_LTE Ostrel_UTRAN2 Modem
 _velmora_roles=(serving serving.{mcc,mnc,area,cell,channel,physical-cell,level,quality} neighbour
     neighbour.{channel,physical-cell,level,quality} registration.state radio.state block-error-rate data-rate)
 
+_velmora_kinds=(cell-reselection handover cell-change technology-change ping-pong late-reselection early-reselection
+    radio-state registration-state mobility-state area-update out-of-service limited-service call-setup call-end
+    call-lost re-establishment context-up context-down address-change evdo-session sim-change gap malformed clock-jump
+    weak-coverage poor-quality pilot-pollution missing-neighbour block-error-burst data-stall fer-alarm)
+
 # Offers those of the words that begin as the present one does.
 _velmora_offer() {
     local word
@@ -106,7 +111,8 @@ _velmora_log() {
     for ((i = 1; i < cword; ++i)); do
         case ${words[i]} in
         --log | --log-level | --format | --every | --select | --from | --to | --code | --technology | --jobs | \
-            --max-age | --duration | --count | --timeout | --description | --role | --by | --clock)
+            --max-age | --duration | --count | --timeout | --description | --role | --kind | --severity | --clock | \
+            --rules | --exec | --exec-timeout | --fail-on | --by)
             ((++i))
             ;;
         -?*) ;;
@@ -124,12 +130,36 @@ _velmora_log() {
         case $command in
         info | diff) _velmora_offer text json ;;
         fields | stats) _velmora_offer text json csv ;;
+        events) _velmora_offer text jsonl csv ;;
         *) _velmora_offer text json jsonl csv ;;
         esac
         return
         ;;
     --role)
         _velmora_offer "${_velmora_roles[@]}"
+        return
+        ;;
+    --kind)
+        # The last one of a list.
+        local earlier=''
+        [[ $cur != *,* ]] || earlier=${cur%,*},
+        _velmora_offer "${_velmora_kinds[@]/#/$earlier}"
+        return
+        ;;
+    --severity | --fail-on | --bell)
+        _velmora_offer info warning critical
+        return
+        ;;
+    --clock)
+        _velmora_offer arrival modem
+        return
+        ;;
+    --rules)
+        _filedir toml
+        return
+        ;;
+    --exec)
+        mapfile -t COMPREPLY < <(compgen -c -- "$cur")
         return
         ;;
     --every)
@@ -140,10 +170,6 @@ _velmora_log() {
         _velmora_offer file technology cell minute
         return
         ;;
-    --clock)
-        _velmora_offer arrival modem
-        return
-        ;;
     --technology)
         _velmora_offer "${_velmora_technologies[@]}" GSM CDMA LTE UTRAN
         return
@@ -152,7 +178,8 @@ _velmora_log() {
         _velmora_path
         return
         ;;
-    --max-age | --from | --to | --code | --jobs | --duration | --count | --timeout | --description)
+    --max-age | --from | --to | --code | --jobs | --duration | --count | --timeout | --description | \
+        --exec-timeout)
         return # nothing that could be guessed
         ;;
     esac
@@ -164,16 +191,18 @@ _velmora_log() {
         if [[ $cur == -* ]]; then
             _velmora_offer "${options[@]}" --version
         else
-            _velmora_offer decode watch record convert info fields stats diff
+            _velmora_offer decode watch record convert info fields events stats diff
         fi
         return
         ;;
     decode) options+=(--format --every --samples --wide --safe --max-age --select --from --to --code --warm --technology --strict --jobs) ;;
-    watch) options+=(--once --timeout) ;;
+    watch) options+=(--once --timeout --bell) ;;
     record) options+=(--force --duration --count --timeout) ;;
     convert) options+=(--force --from --to --code --technology --description --strict) ;;
     info) options+=(--format --technology) ;;
     fields) options+=(--technology --role --format --safe) ;;
+    events) options+=(--format --safe --records --live --clock --technology --kind --severity --from --to --rules
+        --no-rules --exec --exec-timeout --fail-on --duration --count --timeout) ;;
     stats) options+=(--format --safe --histogram --by --select --role --from --to --clock --technology) ;;
     diff) options+=(--format --display --select --role --clock --technology) ;;
     esac
@@ -183,7 +212,7 @@ _velmora_log() {
     fi
     # As many files as the command takes.
     case $command:$files in
-    decode:* | info:* | stats:* | record:0 | convert:[01] | diff:[01]) _filedir '@(pcapng|velmora|dlf)' ;;
+    decode:* | info:* | events:* | stats:* | record:0 | convert:[01] | diff:[01]) _filedir '@(pcapng|velmora|dlf)' ;;
     esac
 }
 

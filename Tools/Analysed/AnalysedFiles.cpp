@@ -25,6 +25,7 @@ bool analyseFile(std::uint32_t index, const AnalysedInput& input, AnalysisFeed& 
     std::optional<ShownProgress> progress;
     FileSource::Hooks hooks;
     hooks.beforeWaiting = input.beforeWaiting;
+    hooks.whileWaiting = input.whileWaiting;
     hooks.mayRead = [&progress](std::uint64_t offset) {
         if (progress && progress->get())
             progress->get()->at(offset);

@@ -21,6 +21,7 @@ struct AnalysedInput {
     bool writesAsItGoes = false;    ///< the output is written to while files are read
     std::function<void(std::uint32_t input)> beginsFile = {}; ///< the next file, before its messages
     std::function<void()> beforeWaiting = {};                 ///< more is waited for, as of a pipe
+    std::function<bool()> whileWaiting = {};                  ///< as FileSource's hook
     std::function<bool()> isDone = {};                        ///< whether the rest need not be read
     std::function<void()> cleanUp = {}; ///< before the program ends on a failure of a decoder
 };

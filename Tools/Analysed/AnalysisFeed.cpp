@@ -30,6 +30,11 @@ void AnalysisFeed::reportLoss(const InputLoss& loss) {
         each->analysis().reportLoss(loss);
 }
 
+void AnalysisFeed::interrupt() {
+    for (const auto& each : _technologies)
+        each->analysis().interrupt();
+}
+
 void AnalysisFeed::finish() {
     for (const auto& each : _technologies)
         each->analysis().finish();

@@ -34,6 +34,8 @@ public:
     [[nodiscard]] Result<TechnologyFeed*> of(const std::string& technology);
     /// Passes a loss to all analyses.
     void reportLoss(const InputLoss& loss);
+    /// The connection that messages come by was lost: passed to all analyses.
+    void interrupt();
     /// There are no more messages: passed to all analyses.
     void finish();
 

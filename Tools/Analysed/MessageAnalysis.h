@@ -18,10 +18,11 @@ namespace velmora {
 struct UndecodedReport {
     MessageNumber message;
     Time time; ///< by the clock of the analysis
+    Time arrival;
     std::string_view reason;
 };
 
-/// A part of an input that gave no messages: a damaged or truncated one, or an interrupted connection.
+/// A part of an input that gave no messages: a damaged or truncated one.
 struct InputLoss {
     MessageNumber at; ///< the lost record, or the next one where its number is unknown
     std::string_view reason;
@@ -37,6 +38,8 @@ public:
     /// Messages may be missing between the latest one and the next. Passed to the analysis of every
     /// technology, since a lost record's is unknown.
     virtual void reportLoss(const InputLoss& /*loss*/) {}
+    /// Messages may be missing as well: the connection that they come by was lost.
+    virtual void interrupt() {}
     /// There are no more messages.
     virtual void finish() {}
 };

@@ -44,8 +44,8 @@ std::optional<std::string> TechnologyFeed::decode(const LoggedMessage& message, 
     _clock.setNow(message.time);
     const auto reportUndecoded = [&](const char* reason) {
         const std::optional<LogMessage> parsed = LogMessage::parse(message.message.bytes());
-        _analysis->reportUndecoded(
-            {_message, timeOf(parsed ? timeOfStamp(parsed->timestamp()) : std::nullopt), reason});
+        const Time time = timeOf(parsed ? timeOfStamp(parsed->timestamp()) : std::nullopt);
+        _analysis->reportUndecoded({_message, time, message.time, reason});
         return std::string(reason);
     };
     try {

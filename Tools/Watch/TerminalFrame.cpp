@@ -55,9 +55,16 @@ ScreenLayout layoutOf(const std::vector<TreeRow>& rows, ScreenSize size) {
     return layout;
 }
 
+ScreenSize withoutEvents(ScreenSize size, std::string_view events) {
+    if (!events.empty() && size.columns >= smallestWithEvents.columns && size.rows >= smallestWithEvents.rows)
+        --size.rows;
+    return size;
+}
+
 std::string composeFrame(const std::vector<TreeRow>& rows, std::string_view status, ScreenSize size,
-                         std::size_t scroll) {
-    const ScreenLayout layout = layoutOf(rows, size);
+                         std::size_t scroll, std::string_view events) {
+    const ScreenSize rest = withoutEvents(size, events);
+    const ScreenLayout layout = layoutOf(rows, rest);
     const std::size_t first = std::min(scroll, layout.maximumScroll());
     std::string frame = home;
     for (std::size_t line = 0; line < layout.rowsPerColumn; ++line) {
@@ -74,6 +81,13 @@ std::string composeFrame(const std::vector<TreeRow>& rows, std::string_view stat
         }
         // After a full line the cursor is still on its last character, which clearing would erase.
         if (column < size.columns)
+            frame += clearToEndOfLine;
+        frame += "\r\n";
+    }
+    if (rest.rows < size.rows) {
+        const std::string line = clipped(events, size.columns);
+        frame += line;
+        if (displayWidth(line) < size.columns)
             frame += clearToEndOfLine;
         frame += "\r\n";
     }

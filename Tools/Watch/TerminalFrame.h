@@ -39,10 +39,17 @@ inline constexpr std::size_t columnGap = 3;
 
 [[nodiscard]] ScreenLayout layoutOf(const std::vector<TreeRow>& rows, ScreenSize size);
 
+/// A smaller window has no line of events.
+inline constexpr ScreenSize smallestWithEvents{30, 8};
+
+/// What is left of the screen for the rows and the status line when it also shows the events.
+[[nodiscard]] ScreenSize withoutEvents(ScreenSize size, std::string_view events);
+
 /// The bytes that redraw the screen in place, without clearing any part in between. `scroll` is the first row
-/// shown; one past the layout's maximum counts as the maximum.
+/// shown; one past the layout's maximum counts as the maximum. `events`: a line above the status line, which
+/// is left out where it is empty or the window too small.
 [[nodiscard]] std::string composeFrame(const std::vector<TreeRow>& rows, std::string_view status,
-                                       ScreenSize size, std::size_t scroll);
+                                       ScreenSize size, std::size_t scroll, std::string_view events = {});
 
 /// Text in rows of at most that many columns, broken at blanks.
 [[nodiscard]] std::vector<TreeRow> adviceRows(std::string_view text, std::size_t columns);

@@ -12,7 +12,9 @@
 #include "Tools/Log/ServiceLog.h"
 #include "Tools/Output.h"
 #include "Tools/Report.h"
+#include "Tools/Rules/RuleFiles.h"
 #include "Tools/ServiceClient.h"
+#include "Tools/Watch/WatchEvents.h"
 #include "Tools/Watch/WatchModel.h"
 #include "Tools/Watch/WatchView.h"
 
@@ -40,10 +42,12 @@ class Watcher final : public ModelObserver {
 public:
     Watcher(const WatchOptions& options, DecoderLines& lines, Output& output, ServiceClient& client)
         : _client(client), _lines(lines), _options(options), _model(newModel()) {
-        if (!_options.once && Terminal::isThere())
+        if (!_options.once && Terminal::isThere()) {
+            watchEvents();
             _view = std::make_unique<ScreenView>([this] { _client.loop.quit(ExitStatus::Done); });
-        else
+        } else {
             _view = std::make_unique<PipeView>(output);
+        }
         // Over the view's own, which holds what is written.
         _log.emplace(lines);
     }
@@ -83,7 +87,13 @@ public:
             _client.loop.quit(ExitStatus::Done);
     }
 
-    void connectionChanged() override { showProblem(); }
+    void connectionChanged() override {
+        showProblem();
+        if (_events && !_model->isConnected()) {
+            const DecoderLog log(_lines);
+            _events->interrupt();
+        }
+    }
 
 private:
     [[nodiscard]] std::shared_ptr<VelmoraModel> newModel() {
@@ -92,7 +102,26 @@ private:
             _view->showNote("the technology is " + std::string(shortTechnologyName(technology)) + " now", {});
             _client.queue.async([this] { beginAnew(); });
         };
+        events.technology = [this](std::string_view technology) {
+            if (_events)
+                _events->setTechnology(technology);
+        };
+        events.message = [this](const Data& message) {
+            if (_events)
+                _events->take(message);
+        };
         return std::make_shared<WatchModel>(_client.platform(), this, _lines, std::move(events));
+    }
+
+    /// Shows the latest events, for which the messages are decoded once more.
+    void watchEvents() {
+        const DecoderLog log(_lines);
+        _catalogues.emplace();
+        // Mistakes in the user's rules are reported by `events`; the screen has no room for them.
+        _rules.emplace(loadRules(*_catalogues, {}));
+        _events.emplace(*_rules, _client.clock, [this](const Event& event, bool isNew) {
+            _view->showEvents(_events->line(), isNew && _options.bell && event.severity >= *_options.bell);
+        });
     }
 
     /// Once for each change of it.
@@ -140,6 +169,9 @@ private:
     DecoderLines& _lines;
     const WatchOptions& _options;
     bool _hasRefresh = false;
+    std::optional<AllCatalogues> _catalogues;
+    std::optional<RuleSet> _rules;
+    std::optional<WatchEvents> _events; ///< on a terminal alone
     std::shared_ptr<VelmoraModel> _model;
     std::unique_ptr<WatchView> _view;
     std::optional<ServiceLog> _log;

@@ -20,6 +20,9 @@ class WatchModel final : public VelmoraModel {
 public:
     struct Events {
         std::function<void(std::string_view technology)> changed;
+        /// The technology of the messages that follow; may be null.
+        std::function<void(std::string_view technology)> technology = {};
+        std::function<void(const Data& message)> message = {}; ///< may be null
     };
 
     WatchModel(ModelPlatform platform, ModelObserver* observer, DecoderLines& lines, Events events)
@@ -28,6 +31,8 @@ public:
     void updateWithData(const Data& data) override {
         const DecoderLog log(_lines);
         VelmoraModel::updateWithData(data);
+        if (_events.message)
+            _events.message(data);
     }
 
 protected:
@@ -37,6 +42,8 @@ protected:
             _events.changed(technology);
         _technology = technology;
         const DecoderLog log(_lines);
+        if (_events.technology)
+            _events.technology(technology);
         std::unique_ptr<LogGenerator> decoder = VelmoraModel::generatorFromTechnology(technology);
         // It is for snapshots, which are not made here, and holds the messages of five refreshes.
         if (decoder)

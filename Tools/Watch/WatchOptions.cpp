@@ -17,11 +17,21 @@ CLI::App* addWatch(CLI::App& app, WatchOptions& options) {
         ->needs(once)
         ->check(positiveSeconds())
         ->type_name("SECONDS");
+    command
+        ->add_option_function<std::string>(
+            "--bell", [&options](const std::string& text) { options.bell = severityNamed(text); },
+            "On a terminal: ring the bell for each event of at least this severity; the default is warning")
+        ->expected(0, 1)
+        ->default_str("warning")
+        ->check(oneOf({"info", "warning", "critical"}))
+        ->type_name("info|warning|critical");
     command->footer(
         "On a terminal the screen is redrawn in place: arrows, j, k, PgUp, PgDn, Home and End scroll,\n"
-        "q quits. On a pipe each refresh is printed, one after another.\n\n"
+        "q quits; a line above the last one has the latest events. On a pipe each refresh is printed, one "
+        "after another.\n\n"
         "Examples:\n"
         "  velmora-log watch\n"
+        "  velmora-log watch --bell critical\n"
         "  velmora-log watch --once | grep -A20 'Serving Cell'");
     return command;
 }

@@ -3,6 +3,8 @@
 
 #pragma once
 
+#include "Analysis/Events/Event.h"
+
 #include <optional>
 
 namespace CLI {
@@ -15,6 +17,7 @@ namespace velmora {
 struct WatchOptions {
     bool once = false;                     ///< print the first refresh and end
     std::optional<double> timeout_seconds; ///< with `once`: how long to wait for that
+    std::optional<Severity> bell;          ///< the bell rings for events of at least this severity
 };
 
 /// Adds the command with its options, help and examples. Parsing fills `options`, which must outlive `app`.

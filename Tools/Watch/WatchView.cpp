@@ -56,6 +56,17 @@ void ScreenView::showNote(const std::string& note, const std::string& advice) {
         draw();
 }
 
+void ScreenView::showEvents(const std::string& line, bool rings) {
+    constexpr std::string_view bell = "\a";
+    if (rings)
+        _terminal.draw(bell);
+    if (line == _events)
+        return;
+    _events = line;
+    if (!_status.empty())
+        draw();
+}
+
 /// The rows, or the advice, a row for each window's width of it, with the note where the status line cuts
 /// that.
 std::vector<TreeRow> ScreenView::shownRows() const {
@@ -79,7 +90,7 @@ void ScreenView::handleInput(std::string_view bytes) {
             _quit();
             return;
         }
-        _scroll = scrolledBy(key, _scroll, layoutOf(shownRows(), _terminal.size()));
+        _scroll = scrolledBy(key, _scroll, layoutOf(shownRows(), withoutEvents(_terminal.size(), _events)));
     }
     if (_scroll != before)
         draw();
@@ -89,7 +100,7 @@ void ScreenView::draw() {
     std::string status = _note.empty() ? _status : _status + " " + _note;
     if (!_rows.empty() && !_advice.empty())
         status += "; " + _advice;
-    _terminal.draw(composeFrame(shownRows(), status, _terminal.size(), _scroll));
+    _terminal.draw(composeFrame(shownRows(), status, _terminal.size(), _scroll, _events));
 }
 
 } // namespace velmora

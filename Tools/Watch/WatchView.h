@@ -26,6 +26,8 @@ public:
     /// Something about the connection that the user should know, with what to do about it, which may be
     /// empty. An empty note takes the earlier one away.
     virtual void showNote(const std::string& note, const std::string& advice) = 0;
+    /// The line of the latest events, for people at a terminal; `rings`: the terminal's bell.
+    virtual void showEvents(const std::string& /*line*/, bool /*rings*/) {}
     /// Whether there is still a reader or a terminal.
     [[nodiscard]] virtual bool isOpen() const = 0;
     /// Restores the terminal, if one is in use.
@@ -56,6 +58,7 @@ public:
     void showRefresh(const std::string& status, std::vector<TreeRow> rows) override;
     void showStatus(const std::string& status) override;
     void showNote(const std::string& note, const std::string& advice) override;
+    void showEvents(const std::string& line, bool rings) override;
     [[nodiscard]] bool isOpen() const override { return true; }
     void restoreTerminal() override;
 
@@ -72,6 +75,7 @@ private:
     std::string _status;
     std::string _note;
     std::string _advice;
+    std::string _events;
     std::vector<TreeRow> _rows;
     std::size_t _scroll = 0;
 };

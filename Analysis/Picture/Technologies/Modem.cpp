@@ -25,6 +25,23 @@ constexpr NeighbourRow neighbours[] = {
 
 constexpr std::string_view ignored[] = {"/Traffic/Bearers/*/Uplink Rate"};
 
+constexpr std::string_view registration = "/Registration/Registration State";
+constexpr MachineRow machines[] = {{EventKind::RegistrationState, "registration", registration}};
+
+// 3GPP TS 27.007 7.2. Denied, a phone may still make emergency calls; idle, it does not look for a network.
+constexpr ServiceRow services[] = {
+    {{registration, 0}, Service::Normal},   {{registration, 1}, Service::Normal},
+    {{registration, 2}, Service::None},     {{registration, 3}, Service::Limited},
+    {{registration, 5}, Service::Normal},   {{registration, 6}, Service::Normal},
+    {{registration, 7}, Service::Normal},   {{registration, 8}, Service::Limited},
+    {{registration, 9}, Service::Normal},   {{registration, 10}, Service::Normal},
+    {{registration, 11}, Service::Limited},
+};
+
+constexpr std::string_view contextLists[] = {"/Packet Data Contexts/Contexts"};
+constexpr std::string_view addresses[] = {"IPv4 Address", "IPv6 Address"};
+constexpr std::string_view sims[] = {"/SIM/ICCID"};
+
 } // namespace
 
 constinit const TechnologyTable technologies::modem{.name = "Modem",
@@ -32,6 +49,13 @@ constinit const TechnologyTable technologies::modem{.name = "Modem",
                                                     .neighbours = neighbours,
                                                     .servingTechnology = "/Serving Cell/Radio Technology",
                                                     .technologyNumbers = numbers,
-                                                    .ignored = ignored};
+                                                    .ignored = ignored,
+                                                    .detectors = {.machines = machines,
+                                                                  .services = services,
+                                                                  .contexts = {.lists = contextLists,
+                                                                               .key = "Bearer",
+                                                                               .addresses = addresses,
+                                                                               .connected = "Connected"},
+                                                                  .sims = sims}};
 
 } // namespace velmora

@@ -40,6 +40,14 @@ constexpr ModeTable modes[] = {{"/Overview/1x State", oneXStates}, {"/Overview/E
 
 constexpr std::string_view ignored[] = {"/Overview/Reverse Link Rate"};
 
+constexpr MachineRow machines[] = {
+    {EventKind::RadioState, "1x", "/Overview/1x State"},
+    {EventKind::RadioState, "EV-DO", "/Overview/EV-DO State"},
+    {EventKind::EVDOSession, "session", "/EV-DO/Session State"},
+};
+
+constexpr CallRow calls[] = {{{"/Overview/1x State", 8}, CallState::Active}}; // traffic
+
 } // namespace
 
 constinit const TechnologyTable technologies::ostrelCDMA{.name = "Ostrel_CDMA",
@@ -47,6 +55,7 @@ constinit const TechnologyTable technologies::ostrelCDMA{.name = "Ostrel_CDMA",
                                                          .modes = modes,
                                                          .ignored = ignored,
                                                          .isHybrid = true,
-                                                         .hasCellInUseAlone = true};
+                                                         .hasCellInUseAlone = true,
+                                                         .detectors = {.machines = machines, .calls = calls}};
 
 } // namespace velmora

@@ -55,9 +55,57 @@ constexpr ModeTable modes[] = {
     {"/Registration/Process CS/MM Service State", registrationStates},
 };
 
+constexpr MachineRow machines[] = {
+    {EventKind::RadioState, "RR", "/GSM/GSM RR Info/RR State"},
+    {EventKind::RadioState, "RRC", "/UMTS/UMTS RR Info/RRC State"},
+    {EventKind::MobilityState, "MM", "/Registration/Process CS/MM State",
+     "/Registration/Process CS/MM Sub State"},
+    {EventKind::MobilityState, "GMM", "/Registration/Process PS/MM State",
+     "/Registration/Process PS/MM Sub State"},
+    {EventKind::RegistrationState, "registration", "/Registration/Process CS/MM Service State"},
+};
+
+constexpr std::string_view serviceType = "/Registration/Serving PLMN/Service Type";
+constexpr std::string_view subState = "/Registration/Process CS/MM Sub State";
+constexpr ServiceRow services[] = {
+    {{serviceType, 0}, Service::None},    {{serviceType, 1}, Service::Normal},
+    {{serviceType, 2}, Service::Normal},  {{serviceType, 3}, Service::Normal},
+    {{serviceType, 4}, Service::Limited}, {{subState, 3}, Service::Limited},
+    {{subState, 6}, Service::None},       {{subState, 8}, Service::Normal},
+};
+
+constexpr std::string_view mmState = "/Registration/Process CS/MM State";
+constexpr CallRow calls[] = {
+    {{mmState, 6}, CallState::Active},
+    {{mmState, 17}, CallState::Reestablishing},
+    {{mmState, 21}, CallState::Reestablishing},
+    {{mmState, 22}, CallState::Reestablishing},
+    {{"/GSM/GSM RR Info/RR State", 20}, CallState::Reestablishing},
+};
+
+// 3GPP TS 24.008 4.1.2.2, 4.1.3.2: roaming, location or routing area not allowed.
+constexpr std::int64_t refused[] = {2, 3};
+constexpr AreaUpdateRow areaUpdates[] = {
+    {"location", mmState, 3, 10, "/Registration/Process CS/LU Reject Cause", 0, refused},
+    {"routing", "/Registration/Process PS/MM State", 5, -1, "/Registration/Process PS/Attach Reject Cause", 0,
+     refused},
+};
+
+constexpr std::string_view contextLists[] = {"/Packet Data/PDP Context Info"};
+constexpr std::string_view addresses[] = {"PDP Address"};
+constexpr std::string_view sims[] = {"/SIM Info/EF-ICCID"};
+
 } // namespace
 
 constinit const TechnologyTable technologies::ostrelGSM{
-    .name = "Ostrel_GSM", .technologies = leaves, .modes = modes};
+    .name = "Ostrel_GSM",
+    .technologies = leaves,
+    .modes = modes,
+    .detectors = {.machines = machines,
+                  .services = services,
+                  .calls = calls,
+                  .areaUpdates = areaUpdates,
+                  .contexts = {.lists = contextLists, .key = "Context ID", .addresses = addresses},
+                  .sims = sims}};
 
 } // namespace velmora

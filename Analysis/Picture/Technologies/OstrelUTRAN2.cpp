@@ -22,13 +22,31 @@ constexpr ModeTable modes[] = {{"/Serving Cell/RRC Info/State", states}};
 
 constexpr NeighbourRow neighbours[] = {{"/Neighbors/Neighbor Cell List/*/Status", NeighbourPart::Set}};
 
+constexpr MachineRow machines[] = {{EventKind::RadioState, "RRC", "/Serving Cell/RRC Info/State"}};
+
+constexpr std::string_view access = "/Serving Cell/Serving Cell Info/Allowed Access";
+constexpr ServiceRow services[] = {{{access, 0}, Service::Normal}, {{access, 1}, Service::Limited}};
+
+// Where it is registered the SIM knows, and no other record does.
+constexpr StoredAreaRow storedAreas[] = {{"location", "/SIM Info/EF-LOCI"}};
+
+constexpr std::string_view contextLists[] = {"/PDP Context Info"};
+constexpr std::string_view addresses[] = {"PDP Address"};
+constexpr std::string_view sims[] = {"/SIM Info/EF-ICCID"};
+
 } // namespace
 
-constinit const TechnologyTable technologies::ostrelUTRAN2{.name = "Ostrel_UTRAN2",
-                                                           .technologies = leaves,
-                                                           .modes = modes,
-                                                           .neighbours = neighbours,
-                                                           .activeSet = 0,
-                                                           .detectedSet = 2};
+constinit const TechnologyTable technologies::ostrelUTRAN2{
+    .name = "Ostrel_UTRAN2",
+    .technologies = leaves,
+    .modes = modes,
+    .neighbours = neighbours,
+    .activeSet = 0,
+    .detectedSet = 2,
+    .detectors = {.machines = machines,
+                  .services = services,
+                  .storedAreas = storedAreas,
+                  .contexts = {.lists = contextLists, .key = "Context ID", .addresses = addresses},
+                  .sims = sims}};
 
 } // namespace velmora

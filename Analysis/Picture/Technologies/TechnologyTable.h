@@ -4,6 +4,7 @@
 #pragma once
 
 #include "Analysis/Picture/RadioTechnology.h"
+#include "Analysis/Picture/Technologies/DetectorTable.h"
 
 #include <cstdint>
 #include <optional>
@@ -75,6 +76,9 @@ struct TechnologyTable {
     bool isHybrid = false;
     /// Only idle and connected do records report a cell; else they have zeros in its place.
     bool hasCellInUseAlone = false;
+    /// Areas that stand for none: with one of them, a message reports no serving cell.
+    std::span<const std::int64_t> noAreas{};
+    DetectorTable detectors{};
 };
 
 /// The table of the decoder; an empty one for a decoder that has none.

@@ -1,0 +1,19 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include "Analysis/Rules/RuleSet.h"
+#include "Tools/Events/EventsOptions.h"
+
+namespace velmora {
+
+class DecoderLines;
+class Output;
+
+/// Lists the events of the files. Returns the exit status; where programs run for events, a signal ends the
+/// process once they are ended.
+[[nodiscard]] int listFileEvents(const EventsOptions& options, const RuleSet& rules, DecoderLines& lines,
+                                 Output& output);
+
+} // namespace velmora

@@ -1,0 +1,170 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
+#include "Tools/Events/LiveEvents.h"
+
+#include "Platform/Linux/SignalWatcher.h"
+#include "Platform/TelephonyService.h"
+#include "Tools/ExitStatus.h"
+#include "Tools/Log/DecoderLog.h"
+#include "Tools/Report.h"
+#include "Tools/Technologies.h"
+
+#include <chrono>
+#include <cmath>
+#include <utility>
+
+namespace velmora {
+
+namespace {
+
+using namespace std::chrono_literals;
+
+/// How often the connection and the reader are checked, and programs.
+constexpr auto checkInterval = 250ms;
+constexpr auto programInterval = 50ms;
+
+std::chrono::nanoseconds nanosecondsOf(double seconds) {
+    return std::chrono::nanoseconds(static_cast<std::int64_t>(std::llround(seconds * 1e9)));
+}
+
+} // namespace
+
+LiveEvents::LiveEvents(const EventsOptions& options, const RuleSet& rules, DecoderLines& lines,
+                       ServiceClient& client, Output& output)
+    : _options(options), _lines(lines), _client(client), _output(output),
+      _listing(options, rules, output, [] { return SignalWatcher::hasSignal(); }),
+      _log(lines, [this](const std::string& problem) { reportProblem(problem); }) {
+    RecordingModel::Events events;
+    events.connecting = [this] {
+        loseService();
+        _client.queue.async([this] { check(); });
+    };
+    events.message = [this](const Data& message) { take(message); };
+    events.sourceEnded = [this] { endWithSource(); };
+    events.technology = [this](std::string_view technology, bool hasDecoder) {
+        return learn(technology, hasDecoder);
+    };
+    _model = std::make_shared<RecordingModel>(client.platform(), std::move(events));
+}
+
+int LiveEvents::run() {
+    const WorkContext context(serviceTitle, [this] {
+        _listing.flush();
+        _model->destroyPorts();
+    });
+    const SignalWatcher signals([this](int) {
+        if (EventPrograms* const programs = _listing.programs())
+            programs->stop();
+        end(true);
+    });
+    _client.queue.async([model = _model] { model->restartMonitor(); });
+    if (_options.duration_seconds)
+        _client.queue.after(nanosecondsOf(*_options.duration_seconds), [this] { end(true); });
+    if (_options.timeout_seconds)
+        _client.queue.after(nanosecondsOf(*_options.timeout_seconds), [this] { giveUp(); });
+    const std::unique_ptr<Timer> checking = _client.queue.repeating(checkInterval, [this] { check(); });
+    std::unique_ptr<Timer> programs;
+    if (_listing.programs())
+        programs = _client.queue.repeating(programInterval, [this] { _listing.programs()->check(); });
+    const bool good = _client.loop.run() == ExitStatus::Done;
+    _model->destroyPorts();
+    {
+        const DecoderLog log(_lines);
+        _listing.finish();
+    }
+    return _listing.status(good);
+}
+
+/// The service has named the technology. Returns whether to start streaming.
+bool LiveEvents::learn(std::string_view technology, bool hasDecoder) {
+    if (_ended)
+        return false;
+    const DecoderLog log(_lines);
+    const Result<TechnologyFeed*> feed = _listing.feed().of(std::string(technology));
+    if (!feed || !hasDecoder) {
+        report("the telephony service speaks " + std::string(shortTechnologyName(technology)) +
+               ", which has no decoder here, wanted one of " + technologyNames());
+        end(false);
+        return false;
+    }
+    _technology = *feed;
+    // The start command follows at once. A service that is lost before the next check is lost all the same.
+    _streaming = true;
+    _hasStreamed = true;
+    return true;
+}
+
+void LiveEvents::take(const Data& message) {
+    if (_ended || !_technology)
+        return;
+    {
+        const DecoderLog log(_lines);
+        LoggedMessage logged;
+        logged.time = _client.clock.now();
+        logged.message = message;
+        logged.number = ++_messages;
+        if (const std::optional<std::string> reason = _technology->decode(logged, 0))
+            report("message " + std::to_string(logged.number) + ": " + *reason);
+    }
+    if ((_options.count && _messages >= *_options.count) || _listing.isDone())
+        end(true);
+}
+
+/// A number of messages that has not come by now does not come at all.
+void LiveEvents::endWithSource() {
+    if (_ended || !_options.count)
+        return;
+    report(std::string(serviceTitle) + "'s source has ended after " + std::to_string(_messages) + " of " +
+           std::to_string(*_options.count) + " messages");
+    end(false);
+}
+
+void LiveEvents::check() {
+    if (_ended)
+        return;
+    if (_output.hasClosedReader() || _listing.isDone()) {
+        end(true);
+        return;
+    }
+    // The model checks by itself, but at the pace of its redraws.
+    _model->refresh();
+    if (!_model->isConnected()) {
+        loseService();
+        return;
+    }
+    _streaming = true;
+    _hasStreamed = true;
+    if (std::exchange(_gone, false))
+        report(std::string(serviceTitle) + " is back");
+}
+
+/// Also at each attempt to connect: the service may have ended and restarted between two checks.
+void LiveEvents::loseService() {
+    if (_ended || !std::exchange(_streaming, false))
+        return;
+    _gone = true;
+    report(std::string(serviceTitle) + " is gone; waiting for it");
+    const DecoderLog log(_lines);
+    _listing.feed().interrupt();
+}
+
+/// At the start. Afterwards a lost service is reported as such, whatever the reason.
+void LiveEvents::reportProblem(const std::string& problem) const {
+    if (!_ended && !_hasStreamed)
+        report(problem + "; retrying");
+}
+
+void LiveEvents::giveUp() {
+    if (_ended || _technology)
+        return;
+    report(timeoutMessage(_log.problem(), *_options.timeout_seconds));
+    end(false);
+}
+
+void LiveEvents::end(bool good) {
+    if (!std::exchange(_ended, true))
+        _client.loop.quit(good ? ExitStatus::Done : ExitStatus::BadInput);
+}
+
+} // namespace velmora

@@ -1,0 +1,59 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include "Analysis/Rules/RuleSet.h"
+#include "Tools/Events/EventListing.h"
+#include "Tools/Events/EventsOptions.h"
+#include "Tools/Log/DecoderLines.h"
+#include "Tools/Log/ServiceLog.h"
+#include "Tools/Output.h"
+#include "Tools/Record/RecordingModel.h"
+#include "Tools/ServiceClient.h"
+
+#include <cstdint>
+#include <memory>
+#include <string>
+#include <string_view>
+
+namespace velmora {
+
+/// Lists the events of what the telephony service sends until a signal, a limit or the reader ends it. Main
+/// thread only.
+class LiveEvents {
+public:
+    /// All must outlive it.
+    LiveEvents(const EventsOptions& options, const RuleSet& rules, DecoderLines& lines, ServiceClient& client,
+               Output& output);
+
+    /// Runs the client's event loop. Returns the exit status.
+    int run();
+
+private:
+    bool learn(std::string_view technology, bool hasDecoder);
+    void take(const Data& message);
+    void endWithSource();
+    void check();
+    void loseService();
+    void giveUp();
+    void reportProblem(const std::string& problem) const;
+    void end(bool good);
+
+    const EventsOptions& _options;
+    DecoderLines& _lines;
+    ServiceClient& _client;
+    Output& _output;
+    EventListing _listing;
+    ServiceLog _log;
+    std::shared_ptr<RecordingModel> _model;
+    TechnologyFeed* _technology = nullptr; ///< the service's; null before it has named one
+    std::uint64_t _messages = 0;
+    bool _streaming = false;   ///< the start command has been sent
+    bool _hasStreamed = false; ///< at any time so far
+    bool _gone = false;        ///< the service is gone, and that has been reported
+    bool _isGood = true;
+    bool _ended = false;
+};
+
+} // namespace velmora
