@@ -116,6 +116,7 @@ ShownValue ObservedDisplay::shown(const Kept& kept, ObservedText& texts) {
             isBinary ? kept.bytes : kept.words,
             std::string(texts.of(observation)),
             kept.rows.empty() ? std::string() : rowText(*observation.leaf, kept.rows, kept.rowKey),
+            kept.rows,
             observation.leaf->index};
 }
 

@@ -23,6 +23,7 @@ struct ShownValue {
     /// What identifies its row from display to display: "10054/45"; empty outside of lists. Rows of one list
     /// that have the same are numbered: "33/0-0 #2".
     std::string row;
+    std::vector<std::uint32_t> rows; ///< the numbers that lead to it in its display, the outermost first
     /// The index of the leaf, or of the first one in the same list: the values of a list's rows are together.
     std::size_t group = 0;
 

@@ -4,6 +4,8 @@
 #include "Tools/Diff/DiffWriter.h"
 
 #include <algorithm>
+#include <cstdint>
+#include <optional>
 
 namespace velmora {
 
@@ -15,8 +17,18 @@ const DiffSide::Display* find(const DiffSide& side, const std::string& technolog
     return found == side.displays().end() ? nullptr : found->get();
 }
 
+bool isIn(const std::vector<std::uint32_t>& rows, const PathPattern::Rows& chosen) {
+    for (std::size_t i = 0; i < chosen.size(); ++i)
+        if (chosen[i] && (i >= rows.size() || rows[i] != *chosen[i]))
+            return false;
+    return true;
+}
+
 bool isChosen(const ShownValue& value, const LeafChoice& choice) {
-    return choice.choose(*value.leaf).has_value();
+    const std::optional<LeafChoice::Leaf> leaf = choice.choose(*value.leaf);
+    return leaf &&
+           (leaf->rows.empty() || std::any_of(leaf->rows.begin(), leaf->rows.end(),
+                                              [&](const auto& rows) { return isIn(value.rows, rows); }));
 }
 
 std::vector<ShownValue> chosenOf(const DiffSide::Display* display, const LeafChoice& choice) {

@@ -115,6 +115,29 @@ TEST_F(DiffCommandTest, TechnologiesThatOneHasAloneAreNamed) {
     object({path("gsm.pcapng"), path("both.pcapng")});
 }
 
+TEST_F(DiffCommandTest, ARowIsChosenByItsNumber) {
+    for (const char* const name : {"a.pcapng", "b.pcapng"}) {
+        const bool isA = name[0] == 'a';
+        const ArrayRef cells = makeArray();
+        for (const char* const level : {isA ? "-70 dBm" : "-71 dBm", isA ? "-80 dBm" : "-85 dBm"}) {
+            const DictionaryRef cell = makeDictionary();
+            cell->set("Level", level);
+            cells->append(cell);
+        }
+        const DictionaryRef display = makeDictionary();
+        display->set("Cells", cells);
+        writeRecording(name, "IFX", {{at(0), serialized(display)}});
+    }
+    const std::string a = path("a.pcapng");
+    const std::string b = path("b.pcapng");
+    EXPECT_EQ(run({"diff", "--display", "--select", "/Cells/1", a, b}),
+              "IFX\n"
+              "           field           row  A        B        B - A\n"
+              "  changed  /Cells/*/Level  1    -80 dBm  -85 dBm     -5\n");
+    EXPECT_THAT(run({"diff", "--display", "--select", "/Cells/*/Level", a, b}),
+                HasSubstr("  changed  /Cells/*/Level  0    -70 dBm  -71 dBm     -1\n"));
+}
+
 TEST_F(DiffCommandTest, NothingIsComparedWithWhatCannotBeRead) {
     writeStates("a.pcapng");
     EXPECT_EQ(run({"diff", path("a.pcapng"), path("gone.pcapng")}, 1), "");
