@@ -121,6 +121,7 @@ TEST_F(DiffCommandTest, ARowIsChosenByItsNumber) {
         const ArrayRef cells = makeArray();
         for (const char* const level : {isA ? "-70 dBm" : "-71 dBm", isA ? "-80 dBm" : "-85 dBm"}) {
             const DictionaryRef cell = makeDictionary();
+            cell->set("Band", "GSM 900");
             cell->set("Level", level);
             cells->append(cell);
         }

@@ -186,6 +186,32 @@ TEST_F(StatsCommandTest, OptionsThatMakeNoSenseTogetherAreRefused) {
     }
 }
 
+TEST_F(StatsCommandTest, TheRecordingsOfAllTechnologiesConform) {
+    for (const char* const name : {"gsm", "lte", "utran", "c2k", "ifx", "modem"}) {
+        ToolProcess::Setup setup =
+            tool({"stats", "--format", "json", "--histogram", "--log-level", "0",
+                  VELMORA_SOURCE_DIR "/Tests/Recordings/" + std::string(name) + ".pcapng"});
+        setup.environment["VELMORA_RESOURCES"] = VELMORA_SOURCE_DIR "/Resources";
+        ToolProcess process(setup);
+        EXPECT_LE(process.exitStatus(), 1) << name; // some have messages that are malformed
+        EXPECT_EQ(checkJSON(schema, process.output()), "1\n") << name;
+    }
+}
+
+TEST_F(StatsCommandTest, TheCheckerFindsWhatIsWrong) {
+    // So that the tests above can fail.
+    const std::string begin = R"({"roles":[{"role":"serving.level",)";
+    const std::string end = R"(}],"technologies":[]})"
+                            "\n";
+    EXPECT_EQ(checkJSON(schema, begin + R"("samples":0,"absent":1)" + end), "1\n");
+    for (const char* const wrong : {
+             R"("absent":1)",                        // no samples
+             R"("samples":1,"absent":0)",            // and no figures
+             R"("samples":0,"absent":0,"median":-1)" // unknown
+         })
+        EXPECT_THAT(checkJSON(schema, begin + wrong + end), StartsWith("status")) << wrong;
+}
+
 TEST_F(StatsCommandTest, WhatIsChosenAndReportsNothingIsListed) {
     writeStates("a.pcapng");
     const Json group = object({"--select", "/UMTS RR Info/Transmit Power", path("a.pcapng")});
