@@ -108,6 +108,8 @@ CommandLine parseCommandLine(int count, const char* const* arguments) {
     commands.add(app, addFields);
     commands.add(app, addEvents);
     commands.add(app, addRules);
+    commands.add(app, addStats);
+    commands.add(app, addDiff);
 
     try {
         app.parse(count, arguments);

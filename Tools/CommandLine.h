@@ -7,11 +7,13 @@
 #include "Platform/SystemLog.h"
 #include "Tools/Convert/ConvertOptions.h"
 #include "Tools/Decode/DecodeOptions.h"
+#include "Tools/Diff/DiffOptions.h"
 #include "Tools/Events/EventsOptions.h"
 #include "Tools/Fields/FieldsOptions.h"
 #include "Tools/Info/InfoOptions.h"
 #include "Tools/Record/RecordOptions.h"
 #include "Tools/Rules/RulesOptions.h"
+#include "Tools/Stats/StatsOptions.h"
 #include "Tools/Watch/WatchOptions.h"
 
 #include <string>
@@ -32,7 +34,7 @@ struct CommandLine {
     bool verbose =
         false; ///< decoder lines as they arise, not summed up; those of objects made and destroyed too
     std::variant<Notice, DecodeOptions, WatchOptions, RecordOptions, ConvertOptions, InfoOptions,
-                 FieldsOptions, EventsOptions, RulesOptions>
+                 FieldsOptions, EventsOptions, RulesOptions, StatsOptions, DiffOptions>
         command;
 };
 

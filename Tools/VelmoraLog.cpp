@@ -9,6 +9,7 @@
 #include "Tools/CommandLine.h"
 #include "Tools/Convert/ConvertCommand.h"
 #include "Tools/Decode/DecodeCommand.h"
+#include "Tools/Diff/DiffCommand.h"
 #include "Tools/Events/EventsCommand.h"
 #include "Tools/ExitStatus.h"
 #include "Tools/Fields/FieldsCommand.h"
@@ -19,6 +20,7 @@
 #include "Tools/Record/RecordCommand.h"
 #include "Tools/Report.h"
 #include "Tools/Rules/RulesCommand.h"
+#include "Tools/Stats/StatsCommand.h"
 #include "Tools/Watch/WatchCommand.h"
 
 #include <csignal>
@@ -50,6 +52,10 @@ int run(const CommandLine& line, DecoderLines& lines, Output& output) {
         return runRecord(*record, lines);
     if (const auto* events = std::get_if<EventsOptions>(&line.command))
         return runEvents(*events, lines, output);
+    if (const auto* stats = std::get_if<StatsOptions>(&line.command))
+        return runStats(*stats, lines, output);
+    if (const auto* diff = std::get_if<DiffOptions>(&line.command))
+        return runDiff(*diff, lines, output);
     const DecoderLog log(lines);
     if (const auto* info = std::get_if<InfoOptions>(&line.command))
         return runInfo(*info, output);

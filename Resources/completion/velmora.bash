@@ -112,7 +112,7 @@ _velmora_log() {
         case ${words[i]} in
         --log | --log-level | --format | --every | --select | --from | --to | --code | --technology | --jobs | \
             --max-age | --duration | --count | --timeout | --description | --role | --kind | --severity | --clock | \
-            --rules | --exec | --exec-timeout | --fail-on)
+            --rules | --exec | --exec-timeout | --fail-on | --by)
             ((++i))
             ;;
         -?*) ;;
@@ -128,8 +128,8 @@ _velmora_log() {
     case $prev in
     --format)
         case $command in
-        info) _velmora_offer text json ;;
-        fields) _velmora_offer text json csv ;;
+        info | diff) _velmora_offer text json ;;
+        fields | stats) _velmora_offer text json csv ;;
         events) _velmora_offer text jsonl csv ;;
         *) _velmora_offer text json jsonl csv ;;
         esac
@@ -166,6 +166,10 @@ _velmora_log() {
         _velmora_offer refresh message
         return
         ;;
+    --by)
+        _velmora_offer file technology cell minute
+        return
+        ;;
     --technology)
         _velmora_offer "${_velmora_technologies[@]}" GSM CDMA LTE UTRAN
         return
@@ -187,7 +191,7 @@ _velmora_log() {
         if [[ $cur == -* ]]; then
             _velmora_offer "${options[@]}" --version
         else
-            _velmora_offer decode watch record convert info fields events rules
+            _velmora_offer decode watch record convert info fields events stats diff rules
         fi
         return
         ;;
@@ -199,6 +203,8 @@ _velmora_log() {
     fields) options+=(--technology --role --format --safe) ;;
     events) options+=(--format --safe --records --live --clock --technology --kind --severity --from --to --rules
         --no-rules --exec --exec-timeout --fail-on --duration --count --timeout) ;;
+    stats) options+=(--format --safe --histogram --by --select --role --from --to --clock --technology) ;;
+    diff) options+=(--format --display --select --role --clock --technology) ;;
     esac
     if [[ $cur == -* ]]; then
         _velmora_offer "${options[@]}"
@@ -208,7 +214,7 @@ _velmora_log() {
     case $command:$files in
     rules:0) _velmora_offer check test ;;
     rules:*) _filedir toml ;;
-    decode:* | info:* | events:* | record:0 | convert:[01]) _filedir '@(pcapng|velmora|dlf)' ;;
+    decode:* | info:* | events:* | stats:* | record:0 | convert:[01] | diff:[01]) _filedir '@(pcapng|velmora|dlf)' ;;
     esac
 }
 

@@ -24,10 +24,10 @@ TEST(CommandLineErrorsTest, UsageErrorsGiveTheFoundAndTheExpectedValue) {
         std::string message;
     };
     const Case cases[] = {
-        {{}, "no command, wanted decode, watch, record, convert, info, fields, events or rules"},
+        {{}, "no command, wanted decode, watch, record, convert, info, fields, events, rules, stats or diff"},
         {{"bogus"},
-         "got bogus, wanted one of the commands decode, watch, record, convert, info, fields, events and "
-         "rules"},
+         "got bogus, wanted one of the commands decode, watch, record, convert, info, fields, events, "
+         "rules, stats and diff"},
         {{"decode"}, "FILE is required"},
         {{"decode", "--format", "xml", "a"}, "--format: got xml, wanted text or json or jsonl or csv"},
         {{"decode", "--every", "day", "a"}, "--every: got day, wanted refresh or message"},

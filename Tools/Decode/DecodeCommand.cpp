@@ -139,7 +139,7 @@ int runDecode(const DecodeOptions& given, DecoderLines& lines, Output& output) {
     DecodeOptions options = given;
     FileTechnologies technologies;
     options.hasTechnologyColumn = needsTechnologyColumn(options, technologies);
-    const KnownCatalogues known(options, technologies);
+    const KnownCatalogues known(options.selection, options.technology, options.files, technologies);
     const auto problem =
         known.areAll() ? impossiblePath(options.selection, known.catalogues()) : std::nullopt;
     if (problem) {

@@ -3,8 +3,8 @@
 
 #include "Tools/Decode/Paths/KnownCatalogues.h"
 
-#include "Tools/Decode/DecodeOptions.h"
 #include "Tools/Decode/Paths/FileTechnologies.h"
+#include "Tools/Decode/Paths/NodeSelection.h"
 #include "Tools/Log/QuietConsole.h"
 #include "Tools/LogOverride.h"
 #include "Tools/Technologies.h"
@@ -24,19 +24,20 @@ public:
 
 } // namespace
 
-KnownCatalogues::KnownCatalogues(const DecodeOptions& options, FileTechnologies& technologies) {
-    if (options.selection.paths().empty())
+KnownCatalogues::KnownCatalogues(const NodeSelection& selection, const std::string& technology,
+                                 const std::vector<std::string>& files, FileTechnologies& technologies) {
+    if (selection.paths().empty())
         return;
-    if (!options.technology.empty()) {
-        add(options.technology);
+    if (!technology.empty()) {
+        add(technology);
         return;
     }
-    for (const std::string& file : options.files) {
+    for (const std::string& file : files) {
         if (file == "-")
             _areAll = false;
         else
-            for (const std::string& technology : technologies.of(file))
-                add(technology);
+            for (const std::string& each : technologies.of(file))
+                add(each);
     }
 }
 

@@ -14,15 +14,16 @@
 namespace velmora {
 
 class FileTechnologies;
-struct DecodeOptions;
+class NodeSelection;
 
 /// The catalogues of the technologies that decoding will meet, as far as they are known before: what standard
 /// input holds is known from its first message on. Made without a line in the log: the decoders are there for
 /// their catalogues alone.
 class KnownCatalogues {
 public:
-    /// None where the options do not need them: without a selection.
-    KnownCatalogues(const DecodeOptions& options, FileTechnologies& technologies);
+    /// None where they are not needed: without a selection. `technology`: the only one; empty for the files'.
+    KnownCatalogues(const NodeSelection& selection, const std::string& technology,
+                    const std::vector<std::string>& files, FileTechnologies& technologies);
     ~KnownCatalogues();
     KnownCatalogues(const KnownCatalogues&) = delete;
     KnownCatalogues& operator=(const KnownCatalogues&) = delete;
