@@ -1,0 +1,32 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
+#include "Telephony/Drives/Truth/StatedState.h"
+
+namespace velmora {
+
+void StatedState::update(TruthTime at, std::string_view state, bool isStated) {
+    if (state != _now) {
+        if (_isPending && _stated && _now != *_stated)
+            tell(_since, true);
+        _now = state;
+        _since = at;
+        _isPending = true;
+    }
+    if (!isStated || !_isPending)
+        return;
+    if (_stated && *_stated != _now)
+        tell(at, false);
+    _stated = _now;
+    _isPending = false;
+}
+
+void StatedState::tell(TruthTime at, bool isHidden) {
+    _sink.happened({at,
+                    std::nullopt,
+                    _kind,
+                    isHidden,
+                    {{"machine", std::string(_machine)}, {"from", _stated.value_or("")}, {"to", _now}}});
+}
+
+} // namespace velmora
