@@ -23,14 +23,21 @@ enum Code : std::uint32_t {
 
 void LTETruth::follow(TruthTime at, std::optional<std::uint32_t> sent) {
     const std::uint32_t code = sent.value_or(0);
-    if (code == connectedMeasurements)
-        _shown = TruthMode::Connected;
-    else if (code == idleMeasurements)
-        _shown = TruthMode::Idle;
+    followMode(at, code);
     _cell.update(at, serving(code));
     if (code == ExtraCode::packetDataContexts)
         _contexts.state(at, _phone.contexts);
     _area.update(at, std::to_string(_phone.registeredArea.lac), code == ExtraCode::simFiles);
+}
+
+void LTETruth::followMode(TruthTime at, std::uint32_t code) {
+    const bool isConnected = code == connectedMeasurements;
+    const bool isIdle = code == idleMeasurements || code == candidates;
+    if (isConnected || isIdle)
+        _shown = isConnected ? TruthMode::Connected : TruthMode::Idle;
+    // For a moment after a change the measurements of the earlier mode still come.
+    _mode.update(at, _phone.connected ? "connected" : "idle",
+                 (isConnected && _phone.connected) || (isIdle && !_phone.connected));
 }
 
 TruthServing LTETruth::serving(std::uint32_t code) const {
@@ -51,8 +58,10 @@ void LTETruth::followUnusual(TruthTime at, UnusualMessage kind, std::size_t numb
     DriveTruth::followUnusual(at, kind, number);
     // One of the three records whose count is too high is a measurement in connected mode; what is in it is
     // shown.
-    if (kind == UnusualMessage::CountOverrun && number / allUnusualMessages.size() % 3 == 0)
-        _shown = TruthMode::Connected;
+    if (kind != UnusualMessage::CountOverrun || number / allUnusualMessages.size() % 3 != 0)
+        return;
+    _shown = TruthMode::Connected;
+    _mode.misstate(at, "connected");
 }
 
 } // namespace velmora

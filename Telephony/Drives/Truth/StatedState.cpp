@@ -8,7 +8,7 @@ namespace velmora {
 void StatedState::update(TruthTime at, std::string_view state, bool isStated) {
     if (state != _now) {
         if (_isPending && _stated && _now != *_stated)
-            tell(_since, true);
+            tell(_since, _now, true);
         _now = state;
         _since = at;
         _isPending = true;
@@ -16,17 +16,26 @@ void StatedState::update(TruthTime at, std::string_view state, bool isStated) {
     if (!isStated || !_isPending)
         return;
     if (_stated && *_stated != _now)
-        tell(at, false);
+        tell(at, _now, _isMisstated);
     _stated = _now;
-    _isPending = false;
+    _isPending = _isMisstated = false;
 }
 
-void StatedState::tell(TruthTime at, bool isHidden) {
-    _sink.happened({at,
-                    std::nullopt,
-                    _kind,
-                    isHidden,
-                    {{"machine", std::string(_machine)}, {"from", _stated.value_or("")}, {"to", _now}}});
+void StatedState::misstate(TruthTime at, std::string_view state) {
+    if (!_stated || *_stated == state)
+        return;
+    tell(at, state, true);
+    _stated = state;
+    _isPending = _isMisstated = true;
+}
+
+void StatedState::tell(TruthTime at, std::string_view to, bool isHidden) {
+    _sink.happened(
+        {at,
+         std::nullopt,
+         _kind,
+         isHidden,
+         {{"machine", std::string(_machine)}, {"from", _stated.value_or("")}, {"to", std::string(to)}}});
 }
 
 } // namespace velmora

@@ -22,8 +22,11 @@ public:
     /// The phone is in that state now, which a message of this moment states or does not.
     void update(TruthTime at, std::string_view state, bool isStated);
 
+    /// A message of this moment states a state that the phone is not in; the change to it and back is hidden.
+    void misstate(TruthTime at, std::string_view state);
+
 private:
-    void tell(TruthTime at, bool isHidden);
+    void tell(TruthTime at, std::string_view to, bool isHidden);
 
     TruthSink& _sink;
     std::string_view _kind;
@@ -31,7 +34,8 @@ private:
     std::string _now;
     TruthTime _since{0};
     std::optional<std::string> _stated;
-    bool _isPending = false; ///< whether `_now` has not been stated yet
+    bool _isPending = false;   ///< whether `_now` has not been stated yet
+    bool _isMisstated = false; ///< whether `_stated` is what the phone has not been in
 };
 
 } // namespace velmora

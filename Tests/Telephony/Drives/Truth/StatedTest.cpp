@@ -61,6 +61,19 @@ TEST(StatedStateTest, aReturnToTheStatedStateIsNoChange) {
     EXPECT_THAT(linesOf(truth), ElementsAre("(2 radio-state idle pending)"));
 }
 
+TEST(StatedStateTest, aStateThatThePhoneIsNotInIsHiddenAndSoIsItsEnd) {
+    KeptTruth truth;
+    StatedState state(truth, "radio-state", "mode");
+    state.update(1s, "idle", true);
+    state.misstate(2s, "connected");
+    state.update(3s, "idle", false);
+    state.update(4s, "idle", true);
+    state.update(5s, "connected", true);
+    EXPECT_THAT(linesOf(truth),
+                ElementsAre("(2 radio-state idle connected)", "(4 radio-state connected idle)",
+                            "5 radio-state idle connected"));
+}
+
 TEST(StatedConditionTest, itLastsFromStatementToStatement) {
     KeptTruth truth;
     StatedCondition condition(truth, "limited-service");
