@@ -19,9 +19,9 @@ std::string_view nameOf(records::RRState state) {
     case DataTransfer: return "data transfer";
     case ConnectionRelease: return "connection release";
     case EarlyCampedWaitForSI: return "early camped, wait for SI";
-    case UMTSToGSMReselection: return "UMTS to GSM reselection";
-    case GSMToUMTSReselection: return "GSM to UMTS reselection";
-    case GSMToUMTSHandover: return "GSM to UMTS handover";
+    case UMTSToGSMReselection: return "W2G interRAT reselection";
+    case GSMToUMTSReselection: return "G2W interRAT reselection";
+    case GSMToUMTSHandover: return "G2W interRAT handover";
     }
     return "";
 }

@@ -9,7 +9,8 @@
 
 #include <string_view>
 
-/// The names of states, as 3GPP TS 24.008 4.1.2 and 4.1.3 and TS 25.331 7.1 have them where they are theirs.
+/// The names of states, as 3GPP TS 24.008 4.1.2 and 4.1.3 and TS 25.331 7.1 have them where they are theirs,
+/// and as the modem calls them otherwise: W is UMTS there, and G is GSM.
 namespace velmora {
 
 [[nodiscard]] std::string_view nameOf(records::RRState state);

@@ -47,10 +47,10 @@ void StatedCell::state(TruthTime at, TruthMode shown) {
         // Without a word of the time in between, the messages show a change that there was not.
         const bool isVisible = !_wasAbsent && shown == _mode;
         if (!_wasAbsent || !_isAbsenceStated)
-            tell(at, kindOf(_wasAbsent ? TruthMode::Unknown : _mode), !isVisible);
+            tell(at, kindOf(_wasAbsent ? TruthMode::Unknown : _mode), *_now, !isVisible);
         if (!_wasAbsent) {
             if (_stated->radio != _now->radio)
-                tell(at, "technology-change", false);
+                tell(at, "technology-change", *_now, false);
             returnTo(at);
         }
     }
@@ -60,13 +60,20 @@ void StatedCell::state(TruthTime at, TruthMode shown) {
     _wasAbsent = _isAbsenceStated = _isPending = false;
 }
 
+void StatedCell::misstate(TruthTime at, const TruthCell& cell) {
+    if (_stated && !_isAbsenceStated)
+        tell(at, kindOf(TruthMode::Unknown), cell, true);
+    _stated = cell;
+    _isAbsenceStated = false;
+}
+
 void StatedCell::returnTo(TruthTime at) {
     if (_left && _left->cell == *_now && at - _left->at <= pingPongTime)
-        tell(at, "ping-pong", false);
+        tell(at, "ping-pong", *_now, false);
     _left = Left{*_stated, at};
 }
 
-void StatedCell::tell(TruthTime at, std::string_view kind, bool isHidden) {
+void StatedCell::tell(TruthTime at, std::string_view kind, const TruthCell& to, bool isHidden) {
     _sink.happened({at,
                     std::nullopt,
                     kind,
@@ -74,9 +81,9 @@ void StatedCell::tell(TruthTime at, std::string_view kind, bool isHidden) {
                     {{"from.radio", std::string(_stated->radio)},
                      {"from.channel", std::to_string(_stated->channel)},
                      {"from.physical-cell", std::to_string(_stated->physical)},
-                     {"to.radio", std::string(_now->radio)},
-                     {"to.channel", std::to_string(_now->channel)},
-                     {"to.physical-cell", std::to_string(_now->physical)}}});
+                     {"to.radio", std::string(to.radio)},
+                     {"to.channel", std::to_string(to.channel)},
+                     {"to.physical-cell", std::to_string(to.physical)}}});
 }
 
 } // namespace velmora

@@ -40,6 +40,9 @@ public:
     explicit StatedCell(TruthSink& sink) : _sink(sink) {}
 
     void update(TruthTime at, const TruthServing& serving);
+    /// A message of this moment states a cell although the phone is on none; the changes to it and from it
+    /// are hidden.
+    void misstate(TruthTime at, const TruthCell& cell);
 
 private:
     struct Left {
@@ -50,7 +53,7 @@ private:
     void change(const TruthServing& serving);
     /// The new cell is stated.
     void state(TruthTime at, TruthMode shown);
-    void tell(TruthTime at, std::string_view kind, bool isHidden);
+    void tell(TruthTime at, std::string_view kind, const TruthCell& to, bool isHidden);
     void returnTo(TruthTime at);
 
     TruthSink& _sink;
