@@ -3,6 +3,7 @@
 
 #include "Telephony/Drives/C2K/C2KTruth.h"
 
+#include <algorithm>
 #include <string>
 
 namespace velmora {
@@ -11,7 +12,10 @@ namespace {
 using namespace records;
 
 /// The codes of C2KRecords.h whose records state the phone.
-enum Code : std::uint32_t { oneXStates = 0x119C, evdoStates = 0x1183, systems = 0x134F };
+enum Code : std::uint32_t { oneXStates = 0x119C, evdoStates = 0x1183, systems = 0x134F, frames = 0x119D };
+
+/// How much of a new frame goes into the average of their errors.
+constexpr double averaging = 1.0 / 64;
 
 // The names of 3GPP2 C.S0005 and C.S0024, where they are theirs.
 
@@ -64,6 +68,7 @@ void C2KTruth::follow(TruthTime at, std::optional<std::uint32_t> sent) {
     }
     _evdo.update(at, nameOf(phone.evdo), code == evdoStates);
     _session.update(at, nameOf(phone.session), code == evdoStates);
+    followMeasurements(at, code);
     _oneXCell.update(at, oneXServing(code));
     _evdoCell.update(at, evdoServing(code));
 }
@@ -73,6 +78,30 @@ void C2KTruth::followCall(TruthTime at) {
     if (isInTraffic != _wasInTraffic)
         tell(at, isInTraffic ? "call-setup" : "call-end", "state", std::string(nameOf(_context.receiver)));
     _wasInTraffic = isInTraffic;
+}
+
+void C2KTruth::followMeasurements(TruthTime at, std::uint32_t code) {
+    const std::size_t limit = _context.phone.inTraffic() ? 3 : 1;
+    if (!_context.phone.serving)
+        _conditions.lose(at);
+    if (code == oneXStates && _context.phone.serving) {
+        double best_dB = -31;
+        for (const C2KPilot& pilot : _context.activeSet(limit))
+            best_dB = std::max(best_dB, pilot.ecio_dB);
+        _conditions.measureQuality(at, "CDMA2000 1x", best_dB);
+    }
+    if (code == frames) {
+        _errorRate += averaging * ((_context.isFrameErased ? 1 : 0) - _errorRate);
+        _errors.measure(at, _errorRate > 0.05, _errorRate <= 0.03);
+    } else if (code == oneXStates && !_context.phone.inTraffic()) {
+        _errorRate = 0;
+        _errors.lose(at);
+    }
+}
+
+void C2KTruth::finish(TruthTime at) {
+    _conditions.finish(at);
+    _errors.finish(at);
 }
 
 TruthServing C2KTruth::oneXServing(std::uint32_t code) const {

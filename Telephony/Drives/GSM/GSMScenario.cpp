@@ -87,7 +87,7 @@ UnusualMessageParts GSMScenario::unusualMessageParts(std::size_t number) {
 }
 
 std::unique_ptr<DriveTruth> GSMScenario::makeTruth(TruthSink& sink) const {
-    return std::make_unique<GSMTruth>(_phone, sink);
+    return std::make_unique<GSMTruth>(_context, sink);
 }
 
 } // namespace velmora

@@ -5,6 +5,7 @@
 
 #include "Telephony/Drives/IFX/IFXDisplay.h"
 #include "Telephony/Drives/Truth/DriveTruth.h"
+#include "Telephony/Drives/Truth/RadioConditions.h"
 #include "Telephony/Drives/Truth/StatedCell.h"
 #include "Telephony/Drives/Truth/StatedCondition.h"
 #include "Telephony/Drives/Truth/StatedContexts.h"
@@ -20,17 +21,20 @@ public:
         : DriveTruth(sink), _phone(phone), _cell(sink),
           _registration(sink, "registration-state", "registration"),
           _area(sink, "area-update", "registration"), _limited(sink, "limited-service"),
-          _searching(sink, "out-of-service"), _contexts(sink) {}
+          _searching(sink, "out-of-service"), _contexts(sink), _conditions(sink) {}
 
     void follow(TruthTime at, std::optional<std::uint32_t> code) override;
-    void finish() override;
+    void finish(TruthTime at) override;
 
 private:
+    void followMeasurements(TruthTime at);
+
     const IFXPhone& _phone;
     StatedCell _cell;
     StatedState _registration, _area;
     StatedCondition _limited, _searching;
     StatedContexts _contexts;
+    RadioConditions _conditions;
     bool _wasCall = false;
 };
 

@@ -202,7 +202,7 @@ UnusualMessageParts LTEScenario::unusualMessageParts(std::size_t number) {
 }
 
 std::unique_ptr<DriveTruth> LTEScenario::makeTruth(TruthSink& sink) const {
-    return std::make_unique<LTETruth>(_phone, sink);
+    return std::make_unique<LTETruth>(_phone, _network, sink);
 }
 
 } // namespace velmora

@@ -160,7 +160,7 @@ UnusualMessageParts ModemScenario::unusualMessageParts(std::size_t number) {
 }
 
 std::unique_ptr<DriveTruth> ModemScenario::makeTruth(TruthSink& sink) const {
-    return std::make_unique<ModemTruth>(_phone, sink);
+    return std::make_unique<ModemTruth>(_phone, _network, sink);
 }
 
 } // namespace velmora

@@ -7,6 +7,7 @@
 
 #include <set>
 #include <string>
+#include <vector>
 
 namespace velmora {
 namespace {
@@ -46,8 +47,41 @@ void ModemTruth::follow(TruthTime at, std::optional<std::uint32_t> sent) {
     _searching.update(at, _phone.registration == Registration::Searching, isRegistrationStated);
     if (_phone.isPresent() && !_phone.isLocked && !_phone.isSIMMissing)
         _sim.update(at, std::to_string(_phone.slot), code == LiveModemCode::sim);
-    if (code != LiveModemCode::contexts)
+    followMeasurements(at, code);
+    if (code == LiveModemCode::contexts)
+        followContexts(at);
+}
+
+void ModemTruth::followMeasurements(TruthTime at, std::uint32_t code) {
+    if (!_phone.serving)
+        _conditions.lose(at);
+    const bool isMeasured = _phone.cellReport == ModemCellReport::Reported && !_phone.isPlaceOnly;
+    if (!_phone.serving || code != LiveModemCode::cells || !isMeasured)
         return;
+    const ModemCell& cell = *_phone.serving;
+    _conditions.measureLevel(at, nameOf(cell.radio), cell.level_dBm);
+    if (cell.radio == ModemCell::Radio::GSM)
+        _conditions.measureNoQuality(at);
+    else
+        _conditions.measureQuality(at, nameOf(cell.radio), cell.quality_dB);
+    followNeighbours(at);
+}
+
+void ModemTruth::followNeighbours(TruthTime at) {
+    if (_phone.radio == ModemCell::Radio::GSM || _phone.neighborReport != ModemCellReport::Reported) {
+        _conditions.measureNoNeighbours(at);
+        return;
+    }
+    const std::size_t reported = _phone.radio == ModemCell::Radio::UMTS ? 6 : 5;
+    std::vector<double> neighbours;
+    for (const ModemCell& each : cellsOf(_network, _phone.radio, _phone.carrier))
+        if (!each.isSameCellAs(*_phone.serving) && each.channel == _phone.serving->channel &&
+            neighbours.size() < reported)
+            neighbours.push_back(each.level_dBm);
+    _conditions.measureNeighbours(at, _phone.serving->level_dBm, neighbours);
+}
+
+void ModemTruth::followContexts(TruthTime at) {
     std::set<int> up;
     for (const ModemBearer& each : _phone.bearers)
         if (each.isConnected)
@@ -67,7 +101,8 @@ TruthServing ModemTruth::serving(std::uint32_t code) const {
     return serving;
 }
 
-void ModemTruth::finish() {
+void ModemTruth::finish(TruthTime at) {
+    _conditions.finish(at);
     _limited.finish();
     _searching.finish();
 }

@@ -189,7 +189,7 @@ UnusualMessageParts UTRANScenario::unusualMessageParts(std::size_t number) {
 }
 
 std::unique_ptr<DriveTruth> UTRANScenario::makeTruth(TruthSink& sink) const {
-    return std::make_unique<UTRANTruth>(_phone, sink);
+    return std::make_unique<UTRANTruth>(_context, sink);
 }
 
 } // namespace velmora

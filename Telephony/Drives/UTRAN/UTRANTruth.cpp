@@ -6,13 +6,14 @@
 #include "LogMessages/LogMessage.h"
 #include "Telephony/Drives/GSM/GSMStateNames.h"
 
+#include <cmath>
 #include <string>
 
 namespace velmora {
 namespace {
 
 /// The codes of UTRANRecords.h whose records state the phone.
-enum Code : std::uint32_t { rrcStates = 0xD0E0, cells = 0xD0E2 };
+enum Code : std::uint32_t { rrcStates = 0xD0E0, cells = 0xD0E2, quality = 0xD00C };
 
 } // namespace
 
@@ -23,9 +24,26 @@ void UTRANTruth::follow(TruthTime at, std::optional<std::uint32_t> sent) {
     _rrc.update(at, nameOf(_phone.rrc), code == rrcStates);
     _cell.update(at, serving(code));
     _limited.update(at, _phone.serving && !_phone.registered, code == cells);
+    if (code == quality)
+        followErrors(at);
     if (code == ExtraCode::packetDataContexts)
         _contexts.state(at, _phone.contexts);
     _area.update(at, std::to_string(_phone.registeredArea.lac), code == ExtraCode::simFiles);
+}
+
+void UTRANTruth::followErrors(TruthTime at) {
+    // One block in ten, as exactly as the records have it: in steps of a 0.065th of a decade.
+    const double manyErrors = std::pow(10.0, -15.5 * 0.065);
+    // Without channels there is nothing to measure.
+    if (_context.worstErrorRate > 0)
+        _errors.measure(at, _context.worstErrorRate >= manyErrors, _context.worstErrorRate < manyErrors);
+    else
+        _errors.lose(at);
+}
+
+void UTRANTruth::finish(TruthTime at) {
+    _limited.finish();
+    _errors.finish(at);
 }
 
 TruthServing UTRANTruth::serving(std::uint32_t code) const {

@@ -4,6 +4,7 @@
 #pragma once
 
 #include "Telephony/Drives/Truth/DriveTruth.h"
+#include "Telephony/Drives/Truth/HeldCondition.h"
 #include "Telephony/Drives/Truth/StatedCell.h"
 #include "Telephony/Drives/Truth/StatedCondition.h"
 #include "Telephony/Drives/Truth/StatedContexts.h"
@@ -16,22 +17,27 @@ namespace velmora {
 class UTRANTruth final : public DriveTruth {
 public:
     /// Both must outlive this.
-    UTRANTruth(const UTRANPhone& phone, TruthSink& sink)
-        : DriveTruth(sink), _phone(phone), _cell(sink), _rrc(sink, "radio-state", "RRC"),
-          _area(sink, "area-update", "registration"), _limited(sink, "limited-service"), _contexts(sink) {}
+    UTRANTruth(const UTRANReportContext& context, TruthSink& sink)
+        : DriveTruth(sink), _context(context), _phone(context.phone), _cell(sink),
+          _rrc(sink, "radio-state", "RRC"), _area(sink, "area-update", "registration"),
+          _limited(sink, "limited-service"), _contexts(sink),
+          _errors(sink, "block-error-burst", std::chrono::seconds(3), std::chrono::seconds(5)) {}
 
     void follow(TruthTime at, std::optional<std::uint32_t> code) override;
     void followUnusual(TruthTime at, UnusualMessage kind, std::size_t number) override;
-    void finish() override { _limited.finish(); }
+    void finish(TruthTime at) override;
 
 private:
+    void followErrors(TruthTime at);
     [[nodiscard]] TruthServing serving(std::uint32_t code) const;
 
+    const UTRANReportContext& _context;
     const UTRANPhone& _phone;
     StatedCell _cell;
     StatedState _rrc, _area;
     StatedCondition _limited;
     StatedContexts _contexts;
+    HeldCondition _errors;
     bool _isRRCShown = true; ///< not after a record of it that is too short
 };
 

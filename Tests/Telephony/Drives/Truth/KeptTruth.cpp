@@ -30,6 +30,21 @@ double secondsOf(TruthTime time) {
     return std::chrono::duration<double>(time).count();
 }
 
+std::vector<std::string> linesOf(const KeptTruth& truth) {
+    std::vector<std::string> lines;
+    for (const TruthEvent& event : truth.events) {
+        std::string line = std::to_string(event.at / std::chrono::seconds(1));
+        if (event.end)
+            line += "-" + std::to_string(*event.end / std::chrono::seconds(1));
+        line.append(" ").append(event.kind);
+        for (const char* name : {"from", "to", "context"})
+            if (const std::string value = fieldOf(event, name); !value.empty())
+                line += " " + value;
+        lines.push_back(event.isHidden ? "(" + line + ")" : line);
+    }
+    return lines;
+}
+
 KeptTruth truthOf(std::string_view scenario, std::uint64_t seed, double duration_s) {
     KeptTruth truth;
     const std::unique_ptr<Scenario> drive = scenarioKindNamed(scenario)->make(seed);

@@ -25,6 +25,9 @@ public:
 /// Empty where there is none of that name.
 [[nodiscard]] std::string fieldOf(const TruthEvent& event, std::string_view name);
 [[nodiscard]] double secondsOf(TruthTime time);
+/// "7 cell-reselection", "7-9 limited-service", "(7 handover)" where it is hidden, by whole seconds; with
+/// what a state or a context changed from and to.
+[[nodiscard]] std::vector<std::string> linesOf(const KeptTruth& truth);
 
 /// The truth of that scenario's first seconds.
 [[nodiscard]] KeptTruth truthOf(std::string_view scenario, std::uint64_t seed, double duration_s);

@@ -1,7 +1,6 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Telephony/Drives/Truth/StatedCell.h"
 #include "Telephony/Drives/Truth/StatedCondition.h"
 #include "Telephony/Drives/Truth/StatedContexts.h"
 #include "Telephony/Drives/Truth/StatedState.h"
@@ -15,23 +14,6 @@ namespace {
 
 using namespace std::chrono_literals;
 using testing::ElementsAre;
-using testing::IsEmpty;
-
-/// "7 cell-reselection", "7-9 limited-service", "(7 handover)" where it is hidden.
-std::vector<std::string> linesOf(const KeptTruth& truth) {
-    std::vector<std::string> lines;
-    for (const TruthEvent& event : truth.events) {
-        std::string line = std::to_string(event.at / 1s);
-        if (event.end)
-            line += "-" + std::to_string(*event.end / 1s);
-        line.append(" ").append(event.kind);
-        for (const char* name : {"from", "to", "context"})
-            if (const std::string value = fieldOf(event, name); !value.empty())
-                line += " " + value;
-        lines.push_back(event.isHidden ? "(" + line + ")" : line);
-    }
-    return lines;
-}
 
 TEST(StatedStateTest, aChangeIsTheDifferenceBetweenTwoStatements) {
     KeptTruth truth;
@@ -111,74 +93,6 @@ TEST(StatedContextsTest, eachContextComesAndGoesByItself) {
     contexts.state(4s, 0);
     EXPECT_THAT(linesOf(truth), ElementsAre("2 context-up 1", "2 context-up 2", "3 context-down 1",
                                             "3 context-up 3", "4 context-down 2", "4 context-down 3"));
-}
-
-class StatedCellTest : public testing::Test {
-protected:
-    static TruthCell cell(int physical, std::string_view radio = "LTE") { return {radio, 1300, physical, 0}; }
-    void on(TruthTime at, std::optional<TruthCell> cell, TruthMode mode = TruthMode::Idle) {
-        serving.update(at, {cell, true, mode, mode});
-    }
-    void unstated(TruthTime at, std::optional<TruthCell> cell) { serving.update(at, {cell, false}); }
-
-    KeptTruth truth;
-    StatedCell serving{truth};
-};
-
-TEST_F(StatedCellTest, theFirstCellIsNoChange) {
-    on(1s, std::nullopt);
-    on(2s, cell(1));
-    EXPECT_THAT(linesOf(truth), IsEmpty());
-}
-
-TEST_F(StatedCellTest, theModeDecidesBetweenReselectionAndHandover) {
-    on(1s, cell(1));
-    on(20s, cell(2), TruthMode::Idle);
-    on(40s, cell(3), TruthMode::Connected);
-    on(60s, cell(4), TruthMode::Unknown);
-    EXPECT_THAT(linesOf(truth), ElementsAre("20 cell-reselection", "40 handover", "60 cell-change"));
-}
-
-TEST_F(StatedCellTest, theModeIsThatOfTheMove) {
-    on(1s, cell(1));
-    serving.update(2s, {cell(2), false, TruthMode::Connected, TruthMode::Connected});
-    serving.update(3s, {cell(2), true, TruthMode::Idle, TruthMode::Connected});
-    EXPECT_THAT(linesOf(truth), ElementsAre("3 handover"));
-}
-
-TEST_F(StatedCellTest, aChangeWhoseModeNoMessageShowsIsHidden) {
-    on(1s, cell(1));
-    serving.update(2s, {cell(2), true, TruthMode::Connected, TruthMode::Idle});
-    EXPECT_THAT(linesOf(truth), ElementsAre("(2 handover)"));
-}
-
-TEST_F(StatedCellTest, anotherRadioTechnologyIsToldBesideTheMove) {
-    on(1s, cell(1, "GSM"));
-    on(2s, cell(1, "UMTS"), TruthMode::Connected);
-    EXPECT_THAT(linesOf(truth), ElementsAre("2 handover", "2 technology-change"));
-}
-
-TEST_F(StatedCellTest, theReturnWithinTenSecondsIsAPingPong) {
-    on(1s, cell(1));
-    on(20s, cell(2));
-    on(30s, cell(1));
-    on(41s, cell(2)); // eleven seconds after it left that one
-    EXPECT_THAT(linesOf(truth), ElementsAre("20 cell-reselection", "30 cell-reselection", "30 ping-pong",
-                                            "41 cell-reselection"));
-}
-
-TEST_F(StatedCellTest, theCellAfterASearchIsNoChange) {
-    on(1s, cell(1));
-    on(2s, std::nullopt);
-    on(3s, cell(2));
-    EXPECT_THAT(linesOf(truth), IsEmpty());
-}
-
-TEST_F(StatedCellTest, aSearchThatNoMessageStatesLooksLikeAChange) {
-    on(1s, cell(1));
-    unstated(2s, std::nullopt);
-    on(3s, cell(2));
-    EXPECT_THAT(linesOf(truth), ElementsAre("(3 cell-change)"));
 }
 
 } // namespace
