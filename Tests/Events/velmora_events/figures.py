@@ -5,7 +5,7 @@
 from collections.abc import Iterable, Sequence
 from dataclasses import dataclass
 
-from velmora_events.kinds import KINDS
+from velmora_events.kinds import KINDS, needed
 from velmora_events.matching import Outcome
 
 
@@ -67,7 +67,7 @@ def rows(table: Table) -> list[tuple[str, ...]]:
                     str(found),
                     _share(figures.precision),
                     _share(figures.recall),
-                    "short" if figures.is_short_of(asked.needed) else "",
+                    "short" if figures.is_short_of(needed(kind, technology)) else "",
                 ))
     return lines
 
@@ -84,11 +84,27 @@ def as_text(lines: Iterable[Sequence[str]]) -> str:
     )
 
 
-def as_markdown(lines: Iterable[Sequence[str]]) -> str:
-    """A table for a document."""
-    heads = "| " + " | ".join(HEADS) + " |"
-    rule = "|---|---|---|---:|---:|---:|---:|---|"
-    return "\n".join([heads, rule, *("| " + " | ".join(row) + " |" for row in lines)])
+def _cell(figures: Figures | None) -> str:
+    if figures is None or figures.both + figures.missed + figures.wrong == 0:
+        return ""
+    happened = figures.both + figures.missed
+    if figures.missed == figures.wrong == 0:
+        return str(happened)
+    return f"{happened}: {_share(figures.precision)}, {_share(figures.recall)}"
+
+
+def as_markdown(table: Table) -> str:
+    """A table for a document: how many of each kind happened, and precision and recall where one is not 1."""
+    scenarios = sorted({scenario for _, scenario in table})
+    lines = [
+        "| kind | " + " | ".join(scenarios) + " |",
+        "|---|" + "---|" * len(scenarios),
+    ]
+    for kind in KINDS:
+        cells = [_cell(table.get((kind, scenario))) for scenario in scenarios]
+        if any(cells):
+            lines.append(f"| `{kind}` | " + " | ".join(cells) + " |")
+    return "\n".join(lines)
 
 
 def short_kinds(table: Table) -> list[str]:
@@ -96,5 +112,5 @@ def short_kinds(table: Table) -> list[str]:
     return [
         f"{kind} of {technology}"
         for (kind, technology), figures in sorted(table.items())
-        if figures.is_short_of(KINDS[kind].needed)
+        if figures.is_short_of(needed(kind, technology))
     ]

@@ -57,5 +57,14 @@ KINDS = {
     "fer-alarm": Kind(DERIVED, 2),
 }
 
+LESS_NEEDED: dict[tuple[str, str], float] = {}
+"""By kind and scenario: what is asked where records cannot support more. Documentation/events.md says why."""
+
+
+def needed(kind: str, scenario: str) -> float:
+    """The least precision and recall of a kind in that scenario."""
+    return LESS_NEEDED.get((kind, scenario), KINDS[kind].needed)
+
+
 MOVES = frozenset({"cell-reselection", "handover", "cell-change"})
 """A move that no record explains may be found as any of these."""

@@ -96,8 +96,7 @@ def main(arguments: Sequence[str] | None = None) -> int:
     except (Problem, OSError) as problem:
         print(f"measure-events: {problem}", file=sys.stderr)
         return 2
-    lines = rows(measurement.table)
-    print(as_markdown(lines) if options.markdown else as_text(lines))
+    print(as_markdown(measurement.table) if options.markdown else as_text(rows(measurement.table)))
     short = short_kinds(measurement.table)
     for each in short:
         print(f"short: {each}")

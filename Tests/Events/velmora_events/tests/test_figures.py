@@ -35,7 +35,16 @@ class FiguresTest(unittest.TestCase):
         self.assertEqual([row[:3] for row in rows(table)], [
             ("handover", "derived", "gsm"), ("handover", "derived", "lte"), ("malformed", "stated", "gsm")])
 
-    def test_both_forms_have_all_rows(self) -> None:
+    def test_text_has_a_line_a_row(self) -> None:
         lines = rows({("handover", "gsm"): Figures(1), ("gap", "gsm"): Figures(wrong=1)})
         self.assertEqual(len(as_text(lines).splitlines()), 3)
-        self.assertEqual(as_markdown(lines).splitlines()[2], "| handover | derived | gsm | 1 | 1 | 1.0000 | 1.0000 |  |")
+
+    def test_markdown_has_a_column_a_scenario(self) -> None:
+        table = {("handover", "lte"): Figures(3, 1), ("handover", "gsm"): Figures(2), ("gap", "gsm"): Figures(wrong=1),
+                 ("ping-pong", "gsm"): Figures(hidden=1)}
+        self.assertEqual(as_markdown(table).splitlines(), [
+            "| kind | gsm | lte |",
+            "|---|---|---|",
+            "| `handover` | 2 | 4: 1.0000, 0.7500 |",
+            "| `gap` | 0: 0.0000, – |  |",
+        ])
