@@ -95,7 +95,7 @@ void DriveScenario::send(double at, const std::optional<RecordBuilder>& record) 
 
 void DriveScenario::finishTruth() {
     if (_truth)
-        _truth->finish(_lastOffset);
+        _truth->finish();
 }
 
 std::chrono::nanoseconds DriveScenario::offsetOf(double at) {

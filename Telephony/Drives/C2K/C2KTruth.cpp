@@ -97,11 +97,15 @@ void C2KTruth::followMeasurements(TruthTime at, std::uint32_t code) {
         _errorRate = 0;
         _errors.lose(at);
     }
+    if (code != 0) {
+        _conditions.confirm(at);
+        _errors.confirm(at);
+    }
 }
 
-void C2KTruth::finish(TruthTime at) {
-    _conditions.finish(at);
-    _errors.finish(at);
+void C2KTruth::finish() {
+    _conditions.finish();
+    _errors.finish();
 }
 
 TruthServing C2KTruth::oneXServing(std::uint32_t code) const {

@@ -23,7 +23,7 @@ public:
           _errors(sink, "fer-alarm", std::chrono::seconds(3), std::chrono::seconds(3)) {}
 
     void follow(TruthTime at, std::optional<std::uint32_t> code) override;
-    void finish(TruthTime at) override;
+    void finish() override;
 
 private:
     [[nodiscard]] TruthServing oneXServing(std::uint32_t code) const;

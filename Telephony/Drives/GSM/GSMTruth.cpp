@@ -90,7 +90,7 @@ void GSMTruth::followMeasurements(TruthTime at, std::uint32_t code) {
         _conditions.measureNoNeighbours(at);
     }
     if (!_blocks.empty() && at - _blocks.back().at >= errorTime)
-        _errors.measure(_blocks.back().at + errorTime, false, true); // no block has come wrong since
+        _errors.measure(at, false, true); // no block has come wrong since
     if (code == gsmLevels && _phone.gsm.cell) {
         _conditions.measureLevel(at, "GSM", _phone.gsm.rssi_dBm);
     } else if (code == activeSet && _phone.umts.cell) {
@@ -100,6 +100,10 @@ void GSMTruth::followMeasurements(TruthTime at, std::uint32_t code) {
         _conditions.measureNeighbours(at, _phone.umts.rscp_dBm, umtsNeighbours());
     } else if (code == blockErrors) {
         followErrors(at);
+    }
+    if (code != 0) {
+        _conditions.confirm(at);
+        _errors.confirm(at);
     }
 }
 
@@ -130,10 +134,10 @@ void GSMTruth::followUnusual(TruthTime at, UnusualMessage kind, std::size_t numb
         followMeasurements(at, gsmLevels);
 }
 
-void GSMTruth::finish(TruthTime at) {
+void GSMTruth::finish() {
     _limited.finish();
-    _conditions.finish(at);
-    _errors.finish(at);
+    _conditions.finish();
+    _errors.finish();
 }
 
 TruthServing GSMTruth::serving(std::uint32_t code) const {

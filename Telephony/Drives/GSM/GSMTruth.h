@@ -24,7 +24,7 @@ public:
 
     void follow(TruthTime at, std::optional<std::uint32_t> code) override;
     void followUnusual(TruthTime at, UnusualMessage kind, std::size_t number) override;
-    void finish(TruthTime at) override;
+    void finish() override;
 
 private:
     /// Transport blocks so far, and how many came wrong.

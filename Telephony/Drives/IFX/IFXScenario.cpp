@@ -71,7 +71,7 @@ void IFXScenario::tellTruth(TruthSink& sink) {
 
 void IFXScenario::finishTruth() {
     if (_truth)
-        _truth->finish(std::chrono::seconds(_seconds));
+        _truth->finish();
 }
 
 void IFXScenario::followTimeline() {

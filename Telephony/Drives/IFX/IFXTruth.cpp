@@ -62,10 +62,11 @@ void IFXTruth::followMeasurements(TruthTime at) {
         _conditions.judgeQuality(at, quality >= 6, quality <= 4);
     else
         _conditions.loseQuality(at);
+    _conditions.confirm(at);
 }
 
-void IFXTruth::finish(TruthTime at) {
-    _conditions.finish(at);
+void IFXTruth::finish() {
+    _conditions.finish();
     _limited.finish();
     _searching.finish();
 }

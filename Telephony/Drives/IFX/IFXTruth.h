@@ -24,7 +24,7 @@ public:
           _searching(sink, "out-of-service"), _contexts(sink), _conditions(sink) {}
 
     void follow(TruthTime at, std::optional<std::uint32_t> code) override;
-    void finish(TruthTime at) override;
+    void finish() override;
 
 private:
     void followMeasurements(TruthTime at);

@@ -33,6 +33,8 @@ void LTETruth::follow(TruthTime at, std::optional<std::uint32_t> sent) {
     const std::uint32_t code = sent.value_or(0);
     followMode(at, code);
     followMeasurements(at, code);
+    if (sent)
+        _conditions.confirm(at);
     _cell.update(at, serving(code));
     if (code == ExtraCode::packetDataContexts)
         _contexts.state(at, _phone.contexts);

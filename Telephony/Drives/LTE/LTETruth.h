@@ -22,7 +22,7 @@ public:
 
     void follow(TruthTime at, std::optional<std::uint32_t> code) override;
     void followUnusual(TruthTime at, UnusualMessage kind, std::size_t number) override;
-    void finish(TruthTime at) override { _conditions.finish(at); }
+    void finish() override { _conditions.finish(); }
 
 private:
     void followMeasurements(TruthTime at, std::uint32_t code);

@@ -48,6 +48,8 @@ void ModemTruth::follow(TruthTime at, std::optional<std::uint32_t> sent) {
     if (_phone.isPresent() && !_phone.isLocked && !_phone.isSIMMissing)
         _sim.update(at, std::to_string(_phone.slot), code == LiveModemCode::sim);
     followMeasurements(at, code);
+    if (sent)
+        _conditions.confirm(at);
     if (code == LiveModemCode::contexts)
         followContexts(at);
 }
@@ -101,8 +103,8 @@ TruthServing ModemTruth::serving(std::uint32_t code) const {
     return serving;
 }
 
-void ModemTruth::finish(TruthTime at) {
-    _conditions.finish(at);
+void ModemTruth::finish() {
+    _conditions.finish();
     _limited.finish();
     _searching.finish();
 }

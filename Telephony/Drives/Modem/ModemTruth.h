@@ -24,7 +24,7 @@ public:
           _conditions(sink) {}
 
     void follow(TruthTime at, std::optional<std::uint32_t> code) override;
-    void finish(TruthTime at) override;
+    void finish() override;
 
 private:
     void followContexts(TruthTime at);

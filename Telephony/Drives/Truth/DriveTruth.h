@@ -30,7 +30,7 @@ public:
     /// To be called after each unusual message; `number` counts them from 0.
     virtual void followUnusual(TruthTime at, UnusualMessage kind, std::size_t number);
     /// The drive is over: what still lasts has no end. The default is for what lasts never.
-    virtual void finish(TruthTime /*at*/) {}
+    virtual void finish() {}
 
 protected:
     [[nodiscard]] TruthSink& sink() const { return _sink; }

@@ -11,7 +11,7 @@ constexpr TruthTime longestUnmeasured = std::chrono::seconds(10);
 } // namespace
 
 void HeldCondition::measure(TruthTime at, bool isSo, bool isEnd) {
-    pass(at - TruthTime(1)); // at the very moment this measurement counts
+    confirmLoss(at);
     _unmeasured.reset();
     if (_isLasting) {
         if (!isEnd)
@@ -23,22 +23,15 @@ void HeldCondition::measure(TruthTime at, bool isSo, bool isEnd) {
     } else if (!_since) {
         _since = at;
     }
-    pass(at);
 }
 
 void HeldCondition::lose(TruthTime at) {
-    pass(at);
     if (!_unmeasured)
         _unmeasured = at;
 }
 
-void HeldCondition::pass(TruthTime at) {
-    if (_unmeasured && at - *_unmeasured >= longestUnmeasured) {
-        if (_isLasting)
-            tell(std::nullopt);
-        _since.reset();
-        return;
-    }
+void HeldCondition::confirm(TruthTime at) {
+    confirmLoss(at);
     if (_unmeasured)
         return;
     if (!_isLasting && _since && at - *_since >= _holdFor)
@@ -49,8 +42,15 @@ void HeldCondition::pass(TruthTime at) {
     }
 }
 
-void HeldCondition::finish(TruthTime at) {
-    pass(at);
+void HeldCondition::confirmLoss(TruthTime at) {
+    if (!_unmeasured || at - *_unmeasured < longestUnmeasured)
+        return;
+    if (_isLasting)
+        tell(std::nullopt);
+    _since.reset();
+}
+
+void HeldCondition::finish() {
     if (_isLasting)
         tell(std::nullopt);
 }

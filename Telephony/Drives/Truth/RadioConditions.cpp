@@ -59,10 +59,14 @@ void RadioConditions::lose(TruthTime at) {
     _poor.lose(at);
 }
 
-void RadioConditions::finish(TruthTime at) {
-    _pollution.finish(at);
-    _weak.finish(at);
-    _poor.finish(at);
+void RadioConditions::confirm(TruthTime at) {
+    for (HeldCondition* each : {&_weak, &_poor, &_pollution})
+        each->confirm(at);
+}
+
+void RadioConditions::finish() {
+    for (HeldCondition* each : {&_weak, &_poor, &_pollution})
+        each->finish();
 }
 
 } // namespace velmora

@@ -33,7 +33,9 @@ public:
     /// The phone is on no cell any more.
     void lose(TruthTime at);
     void loseQuality(TruthTime at) { _poor.lose(at); }
-    void finish(TruthTime at);
+    /// To be called after each message, and after what it measures.
+    void confirm(TruthTime at);
+    void finish();
 
 private:
     static constexpr TruthTime held = std::chrono::seconds(5);

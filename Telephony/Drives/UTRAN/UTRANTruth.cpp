@@ -26,6 +26,8 @@ void UTRANTruth::follow(TruthTime at, std::optional<std::uint32_t> sent) {
     _limited.update(at, _phone.serving && !_phone.registered, code == cells);
     if (code == quality)
         followErrors(at);
+    if (sent)
+        _errors.confirm(at);
     if (code == ExtraCode::packetDataContexts)
         _contexts.state(at, _phone.contexts);
     _area.update(at, std::to_string(_phone.registeredArea.lac), code == ExtraCode::simFiles);
@@ -41,9 +43,9 @@ void UTRANTruth::followErrors(TruthTime at) {
         _errors.lose(at);
 }
 
-void UTRANTruth::finish(TruthTime at) {
+void UTRANTruth::finish() {
     _limited.finish();
-    _errors.finish(at);
+    _errors.finish();
 }
 
 TruthServing UTRANTruth::serving(std::uint32_t code) const {

@@ -17,9 +17,14 @@ using testing::IsEmpty;
 
 class HeldConditionTest : public testing::Test {
 protected:
-    void poor(TruthTime at) { condition.measure(at, true, false); }
-    void between(TruthTime at) { condition.measure(at, false, false); }
-    void good(TruthTime at) { condition.measure(at, false, true); }
+    void poor(TruthTime at) { measure(at, true, false); }
+    void between(TruthTime at) { measure(at, false, false); }
+    void good(TruthTime at) { measure(at, false, true); }
+
+    void measure(TruthTime at, bool isSo, bool isEnd) {
+        condition.measure(at, isSo, isEnd);
+        condition.confirm(at);
+    }
 
     KeptTruth truth;
     HeldCondition condition{truth, "poor-quality", 5s, 3s}; ///< begins after five seconds, ends after three
@@ -33,11 +38,14 @@ TEST_F(HeldConditionTest, itBeginsWhereItHasHeldForLongEnough) {
     EXPECT_THAT(linesOf(truth), ElementsAre("10-20 poor-quality"));
 }
 
-TEST_F(HeldConditionTest, aMeasurementCountsUntilTheNextOne) {
+TEST_F(HeldConditionTest, aMessageHasToConfirmIt) {
     poor(10s);
-    good(16s);
-    good(19s);
-    EXPECT_THAT(linesOf(truth), ElementsAre("10-16 poor-quality"));
+    good(16s); // what was at fifteen seconds, no message says
+    poor(20s);
+    condition.confirm(25s);
+    good(26s);
+    good(29s);
+    EXPECT_THAT(linesOf(truth), ElementsAre("20-26 poor-quality"));
 }
 
 TEST_F(HeldConditionTest, whatHeldForLessIsNone) {
@@ -46,7 +54,7 @@ TEST_F(HeldConditionTest, whatHeldForLessIsNone) {
     poor(16s);
     between(20s);
     poor(21s);
-    condition.finish(25s);
+    condition.finish();
     EXPECT_THAT(linesOf(truth), IsEmpty());
 }
 
@@ -56,7 +64,7 @@ TEST_F(HeldConditionTest, whatEndsItHasToHoldToo) {
     good(20s);
     between(22s);
     good(30s);
-    between(34s);
+    condition.confirm(33s);
     EXPECT_THAT(linesOf(truth), ElementsAre("10-30 poor-quality"));
 }
 
@@ -73,7 +81,7 @@ TEST_F(HeldConditionTest, itHasNoEndWhereNothingIsMeasuredForTenSeconds) {
     poor(10s);
     poor(16s);
     condition.lose(17s);
-    condition.lose(27s);
+    condition.confirm(27s);
     good(28s);
     good(40s);
     EXPECT_THAT(linesOf(truth), ElementsAre("10 poor-quality"));
@@ -82,26 +90,31 @@ TEST_F(HeldConditionTest, itHasNoEndWhereNothingIsMeasuredForTenSeconds) {
 TEST_F(HeldConditionTest, whatIsNotMeasuredDoesNotBegin) {
     poor(10s);
     condition.lose(11s);
-    condition.finish(18s);
+    condition.confirm(18s);
     EXPECT_THAT(linesOf(truth), IsEmpty());
 }
 
 TEST_F(HeldConditionTest, whatStillLastsAtTheEndHasNoEnd) {
     poor(10s);
-    condition.finish(15s);
+    poor(15s);
+    condition.finish();
     EXPECT_THAT(linesOf(truth), ElementsAre("10 poor-quality"));
 }
 
 TEST(RadioConditionsTest, eachTechnologyHasItsLimits) {
     KeptTruth truth;
     RadioConditions conditions(truth);
-    conditions.measureLevel(0s, "GSM", -100); // not below the limit
-    conditions.measureLevel(10s, "GSM", -101);
-    conditions.measureLevel(20s, "UMTS", -107);
-    conditions.measureLevel(30s, "UMTS", -111);
-    conditions.measureLevel(40s, "LTE", -112);
-    conditions.measureLevel(50s, "NR", -115.1);
-    conditions.finish(60s);
+    const auto measure = [&](TruthTime at, const char* radio, double level_dBm) {
+        conditions.measureLevel(at, radio, level_dBm);
+        conditions.confirm(at + 5s);
+    };
+    measure(0s, "GSM", -100); // not below the limit
+    measure(10s, "GSM", -101);
+    measure(20s, "UMTS", -107);
+    measure(30s, "UMTS", -111);
+    measure(40s, "LTE", -112);
+    measure(50s, "NR", -115.1);
+    conditions.finish();
     EXPECT_THAT(linesOf(truth),
                 ElementsAre("10-20 weak-coverage", "30-40 weak-coverage", "50 weak-coverage"));
 }
@@ -109,11 +122,14 @@ TEST(RadioConditionsTest, eachTechnologyHasItsLimits) {
 TEST(RadioConditionsTest, threeNeighboursOfNearlyItsLevelPolluteTheServingCell) {
     KeptTruth truth;
     RadioConditions conditions(truth);
-    conditions.measureNeighbours(0s, -90, {-94, -94});
-    conditions.measureNeighbours(10s, -90, {-80, -94, -94.9, -95});
-    conditions.measureNeighbours(20s, -90, {-80, -94, -96.9}); // three within 7 dB
-    conditions.measureNeighbours(30s, -90, {-80, -94, -97});
-    conditions.measureNeighbours(40s, -90, {});
+    const auto measure = [&](TruthTime at, const std::vector<double>& neighbours_dBm) {
+        conditions.measureNeighbours(at, -90, neighbours_dBm);
+        conditions.confirm(at + 5s);
+    };
+    measure(0s, {-94, -94});
+    measure(10s, {-80, -94, -94.9, -95});
+    measure(20s, {-80, -94, -96.9}); // three within 7 dB
+    measure(30s, {-80, -94, -97});
     EXPECT_THAT(linesOf(truth), ElementsAre("10-30 pilot-pollution"));
 }
 
