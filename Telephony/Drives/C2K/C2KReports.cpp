@@ -49,8 +49,9 @@ Report frame(Context& context) {
     double best_dB = -31;
     for (const C2KPilot& pilot : context.activeSet(3))
         best_dB = std::max(best_dB, pilot.ecio_dB);
-    return trafficFrame(
-        context.random.chance(std::clamp(0.01 * std::exp(0.7 * (-10 - best_dB)), 0.003, 0.3)));
+    context.isFrameErased =
+        context.random.chance(std::clamp(0.01 * std::exp(0.7 * (-10 - best_dB)), 0.003, 0.3));
+    return trafficFrame(context.isFrameErased);
 }
 
 std::int64_t second(const Context& context) {
@@ -133,6 +134,7 @@ Report oneXStatusReport(Context& context) {
     // Between two pages the receiver sleeps.
     if (phone.oneX == OneXState::Paging && !phone.onPacketData() && context.random.chance(0.4))
         report.state = OneXState::SlottedSleep;
+    context.receiver = report.state;
     if (phone.serving)
         report.serving = phone.serving->sector;
     report.received_dBm[0] = received(context);

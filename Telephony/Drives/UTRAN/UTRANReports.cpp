@@ -130,10 +130,15 @@ std::optional<RecordBuilder> utranReports::gsmNeighbours(UTRANReportContext& con
 
 std::optional<RecordBuilder> utranReports::quality(UTRANReportContext& context) {
     const UTRANPhone& phone = context.phone;
+    context.worstErrorRate = 0;
     if (!phone.serving || !phone.hasChannels())
         return utranChannelQuality({}, {});
     const double sir_dB = signalToInterference_dB(context);
     const double rate = blockErrorRate(sir_dB);
+    const bool hasBearer = phone.rrc == RRCState::CellFACH || phone.contexts > 0;
+    context.worstErrorRate = phone.call && phone.rrc == RRCState::CellDCH ? 2 * rate
+                             : hasBearer                                  ? rate
+                                                                          : rate / 10;
     const auto composite = [&](int identity, int slots) {
         UTRANCompositeChannel channel{identity, slots, {}};
         for (double& ratio : channel.sir_dB)

@@ -35,7 +35,8 @@ struct UTRANReportContext {
     const UTRANPhone& phone;
     const UTRANNetwork& network;
     ScenarioRandom& random;
-    bool binary = false; ///< the form of the next property list; reports toggle it
+    bool binary = false;       ///< the form of the next property list; reports toggle it
+    double worstErrorRate = 0; ///< of the blocks of all channels, in the latest report of their quality
 };
 
 using UTRANReport = PeriodicReport<UTRANReportContext>;
