@@ -8,6 +8,7 @@
 #include "Analysis/Rules/Rule.h"
 
 #include <algorithm>
+#include <numeric>
 #include <utility>
 
 namespace velmora {
@@ -20,6 +21,10 @@ bool meet(const Rule& a, const Rule& b) {
            std::any_of(a.technologies.begin(), a.technologies.end(), [&b](const std::string& each) {
                return std::find(b.technologies.begin(), b.technologies.end(), each) != b.technologies.end();
            });
+}
+
+std::size_t windowsOf(const Rule& rule) {
+    return rule.when.windows.size() + (rule.clear ? rule.clear->windows.size() : 0);
 }
 
 } // namespace
@@ -71,6 +76,11 @@ std::string RuleSet::insert(Rule rule) {
                (*other)->file + ":" + std::to_string((*other)->line);
     if (_rules.size() == mostRules)
         return "got more than " + std::to_string(mostRules) + " rules";
+    const std::size_t windows = std::accumulate(
+        _rules.begin(), _rules.end(), windowsOf(rule),
+        [](std::size_t sum, const std::shared_ptr<const Rule>& each) { return sum + windowsOf(*each); });
+    if (windows > mostWindows)
+        return "got more than " + std::to_string(mostWindows) + " windows of time in all rules";
     const auto place = std::upper_bound(
         _rules.begin(), _rules.end(), rule.name,
         [](const std::string& name, const std::shared_ptr<const Rule>& each) { return name < each->name; });

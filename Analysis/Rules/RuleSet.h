@@ -67,6 +67,7 @@ public:
     [[nodiscard]] std::span<const Catalogue* const> catalogues() const { return _catalogues; }
 
     static constexpr std::size_t mostRules = 4096;
+    static constexpr std::size_t mostWindows = 2048; ///< of time, of all rules: each keeps values
     static constexpr std::size_t mostBytes = std::size_t{1} << 20; ///< of a file
 
 private:

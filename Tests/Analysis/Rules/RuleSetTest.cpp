@@ -91,6 +91,17 @@ TEST_F(RuleSetTest, ABuiltInRuleWhosePathsTheDisplayLacksIsLeftOutWithoutAMistak
     EXPECT_EQ(rules.errors().size(), 1U);
 }
 
+TEST_F(RuleSetTest, ABoundedNumberOfWindowsIsTaken) {
+    std::string text;
+    for (int i = 0; i < 1025; ++i)
+        text += rule("r" + std::to_string(i), "",
+                     "clear = \"delta(serving.level, 5 s) > 3 or delta(serving.level, 9 s) > 3\"\n");
+    rules.add({"one.toml", text, 1});
+    EXPECT_EQ(rules.rules().size(), 1024U); // of two windows each
+    ASSERT_EQ(rules.errors().size(), 1U);
+    EXPECT_EQ(rules.errors()[0].text, "got more than 2048 windows of time in all rules");
+}
+
 TEST_F(RuleSetTest, ALongFileIsNotRead) {
     rules.add({"one.toml", std::string(RuleSet::mostBytes + 1, '#'), 1});
     ASSERT_EQ(rules.errors().size(), 1U);
