@@ -14,6 +14,7 @@
 #include "Tools/Info/InfoCommand.h"
 #include "Tools/Log/DecoderLog.h"
 #include "Tools/Log/QuietConsole.h"
+#include "Tools/Mask/MaskCommand.h"
 #include "Tools/Output.h"
 #include "Tools/Record/RecordCommand.h"
 #include "Tools/Report.h"
@@ -51,6 +52,8 @@ int run(const CommandLine& line, DecoderLines& lines, Output& output) {
         return runInfo(*info, output);
     if (const auto* fields = std::get_if<FieldsOptions>(&line.command))
         return runFields(*fields, output);
+    if (const auto* mask = std::get_if<MaskCommandOptions>(&line.command))
+        return runMask(*mask, output);
     return runConvert(std::get<ConvertOptions>(line.command));
 }
 
