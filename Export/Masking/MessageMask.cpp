@@ -44,12 +44,18 @@ bool isBinary(Bytes list) {
 /// Whether length and time stamp are such that nothing else can be there. The stamp is 0 or within two days
 /// of the arrival.
 bool isHeader(const LogMessage& message, Time arrival) {
-    constexpr std::chrono::hours near(48);
+    constexpr std::uint64_t near = std::chrono::nanoseconds(std::chrono::hours(48)).count();
     if (message.record.size() - LogMessage::lengthOffset != message.length())
         return false;
     const std::uint64_t stamp = message.timestamp().value_or(0);
     const std::optional<Time> time = timeOfRecord(stamp);
-    return stamp == 0 || (time && *time > arrival - near && *time < arrival + near);
+    if (stamp == 0 || !time)
+        return stamp == 0;
+    // Unsigned, since times may be as far apart as there are any.
+    const auto [early, late] = std::minmax(*time, arrival);
+    return static_cast<std::uint64_t>(late.time_since_epoch().count()) -
+               static_cast<std::uint64_t>(early.time_since_epoch().count()) <
+           near;
 }
 
 constexpr std::string_view emptyArray = "<array/>";

@@ -26,7 +26,9 @@ struct MaskOptions {
     [[nodiscard]] bool masksAreas() const {
         return level >= MaskLevel::Location && (!done || *done < MaskLevel::Location);
     }
-    [[nodiscard]] bool masksTimes() const { return level >= MaskLevel::All; }
+    [[nodiscard]] bool masksTimes() const {
+        return level >= MaskLevel::All && (!done || *done < MaskLevel::All);
+    }
 };
 
 /// The pseudonyms of one key.

@@ -5,6 +5,7 @@
 
 #include "Platform/Clock.h"
 
+#include <algorithm>
 #include <chrono>
 #include <cstdint>
 
@@ -16,15 +17,20 @@ public:
     /// 2000-01-01 00:00:00 UTC.
     static constexpr Time epoch = std::chrono::sys_days(std::chrono::year(2000) / 1 / 1);
 
-    /// The first message's time decides; later calls have no effect.
+    /// The first message's time decides; later calls have no effect. One before 1970 counts as that.
     void begin(Time first) {
         if (!_hasBegun)
-            _shift = first - epoch;
+            _shift = std::max(first, Time()) - epoch;
         _hasBegun = true;
     }
     /// What is subtracted from each time.
     [[nodiscard]] std::chrono::nanoseconds shift() const { return _shift; }
-    [[nodiscard]] Time shifted(Time time) const { return time - _shift; }
+    /// As far as there are times.
+    [[nodiscard]] Time shifted(Time time) const {
+        if (_shift.count() < 0)
+            return time > Time::max() + _shift ? Time::max() : time - _shift;
+        return time < Time::min() + _shift ? Time::min() : time - _shift;
+    }
     /// A record's time stamp; 0 for one that denotes no time.
     [[nodiscard]] std::uint64_t shiftedStamp(std::uint64_t stamp) const;
 

@@ -140,6 +140,14 @@ _velmora_log() {
         _velmora_offer "${_velmora_technologies[@]}" GSM CDMA LTE UTRAN
         return
         ;;
+    --level)
+        _velmora_offer identity location all
+        return
+        ;;
+    --key | --new-key | --known)
+        _filedir
+        return
+        ;;
     --select)
         _velmora_path
         return
@@ -156,7 +164,7 @@ _velmora_log() {
         if [[ $cur == -* ]]; then
             _velmora_offer "${options[@]}" --version
         else
-            _velmora_offer decode watch record convert info fields
+            _velmora_offer decode watch record convert info fields mask
         fi
         return
         ;;
@@ -166,6 +174,7 @@ _velmora_log() {
     convert) options+=(--force --from --to --code --technology --description --strict) ;;
     info) options+=(--format --technology) ;;
     fields) options+=(--technology --role --format --safe) ;;
+    mask) options+=(--level --key --technology --keep-unknown --report --force --new-key --check --known) ;;
     esac
     if [[ $cur == -* ]]; then
         _velmora_offer "${options[@]}"
@@ -173,7 +182,7 @@ _velmora_log() {
     fi
     # As many files as the command takes.
     case $command:$files in
-    decode:* | info:* | record:0 | convert:[01]) _filedir '@(pcapng|velmora|dlf)' ;;
+    decode:* | info:* | record:0 | convert:[01] | mask:[01]) _filedir '@(pcapng|velmora|dlf)' ;;
     esac
 }
 

@@ -61,13 +61,15 @@ CLI::App* addMask(CLI::App& app, MaskCommandOptions& options) {
             ->add_option("--known", options.knownFile,
                          "With --check, look for these values too, one a line, in any encoding")
             ->type_name("FILE");
-    known->needs(check);
-    for (CLI::Option* other : {out, key, keep, report, force}) {
-        newKey->excludes(other);
-        check->excludes(other);
-    }
-    newKey->excludes(check)->excludes(file);
-    command->callback([&options] {
+    // Not by the options themselves, whose help would be longer than what it says.
+    command->callback([=, &options] {
+        for (CLI::Option* const alone : {newKey, check})
+            for (CLI::Option* const other : {newKey, check, file, out, key, keep, report, force})
+                if (alone->count() != 0 && other->count() != 0 && other != alone &&
+                    !(alone == check && other == file))
+                    throw CLI::ExcludesError(alone->get_name(), other->get_name());
+        if (known->count() != 0 && check->count() == 0)
+            throw CLI::RequiresError(known->get_name(), check->get_name());
         if (options.newKey.empty() && options.file.empty())
             throw CLI::RequiredError("FILE");
         if (options.newKey.empty() && !options.checks && options.out.empty())
@@ -78,8 +80,8 @@ CLI::App* addMask(CLI::App& app, MaskCommandOptions& options) {
         "identities; what is not known to identify nobody is removed, and so are descriptions, comments and\n"
         "blocks of other programs. Pseudonyms have the form of what they stand for.\n\n"
         "Not hidden: level identity does not hide where the phone was; neighbour lists, channels and levels\n"
-        "identify places at every level; level location keeps positions, if a message has them; times tell\n"
-        "who was there, unless the level is all. Whoever has the key can find the values again by trial.\n\n"
+        "identify places at every level; level location keeps positions, if a message has them; times can\n"
+        "show who was there, unless the level is all. The holder of the key finds values again by trial.\n\n"
         "OUT is complete or does not exist. Losses in FILE are reported and give exit status 1; the rest is\n"
         "masked.\n\n"
         "Examples:\n"
