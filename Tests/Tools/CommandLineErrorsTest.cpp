@@ -24,9 +24,19 @@ TEST(CommandLineErrorsTest, UsageErrorsGiveTheFoundAndTheExpectedValue) {
         std::string message;
     };
     const Case cases[] = {
-        {{}, "no command, wanted decode, watch, record, convert, info or fields"},
-        {{"bogus"}, "got bogus, wanted one of the commands decode, watch, record, convert, info and fields"},
+        {{}, "no command, wanted decode, watch, record, convert, info, fields or mask"},
+        {{"bogus"},
+         "got bogus, wanted one of the commands decode, watch, record, convert, info, fields and mask"},
         {{"decode"}, "FILE is required"},
+        {{"mask"}, "FILE is required"},
+        {{"mask", "a.pcapng"}, "OUT is required"},
+        {{"mask", "a.pcapng", "b.txt"},
+         "OUT: got b.txt, wanted a name that ends in .pcapng, .velmora or .dlf"},
+        {{"mask", "--level", "none", "a.pcapng", "b.pcapng"},
+         "--level: got none, wanted identity or location or all"},
+        {{"mask", "--check", "a.pcapng", "b.pcapng"}, "--check excludes OUT"},
+        {{"mask", "--new-key", "k", "a.pcapng"}, "--new-key excludes FILE"},
+        {{"mask", "--known", "k", "a.pcapng", "b.pcapng"}, "--known requires --check"},
         {{"decode", "--format", "xml", "a"}, "--format: got xml, wanted text or json or jsonl or csv"},
         {{"decode", "--every", "day", "a"}, "--every: got day, wanted refresh or message"},
         {{"decode", "--select", "GSM", "a"}, "--select: got GSM, wanted a path that begins with a slash"},
