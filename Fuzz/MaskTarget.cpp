@@ -3,6 +3,7 @@
 
 #include "Export/Masking/MaskedRecording.h"
 #include "Export/Masking/MessageMask.h"
+#include "Export/Masking/TechnologyName.h"
 #include "Fuzz/FuzzTargets.h"
 #include "Platform/TelephonyService.h"
 #include "Recording/OpenMessages.h"
@@ -81,7 +82,7 @@ private:
         MessageMask mask(options);
         _isRecording = (*reader)->form() == "recording";
         while (const auto message = (*reader)->next()) {
-            const std::string named = (*reader)->technologies()[message->technology];
+            const std::string named = technologyOf(*message, **reader);
             const std::string name = isTechnology(named) ? named : std::string(otherwise);
             if (const auto each = mask.mask(*message, name))
                 require(bool(recording.add(each->time, each->message.bytes(), name)),

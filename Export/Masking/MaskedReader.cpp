@@ -3,9 +3,11 @@
 
 #include "Export/Masking/MaskedReader.h"
 
+#include "Export/Masking/TechnologyName.h"
 #include "LogMessages/LogMessage.h"
 #include "Platform/TelephonyService.h"
 
+#include <algorithm>
 #include <utility>
 
 namespace velmora {
@@ -26,11 +28,11 @@ bool isInChain(Bytes bytes, std::string_view technology) {
 std::optional<LoggedMessage> MaskedReader::next() {
     while (std::optional<LoggedMessage> message = _reader.next()) {
         addLosses();
-        if (message->technology >= _names.size())
-            _names = _reader.technologies();
         // A name may become known with the first message.
-        if (_names[message->technology].empty())
-            _names = _reader.technologies();
+        if (message->technology >= _names.size() || _names[message->technology].empty()) {
+            _names.resize(std::max<std::size_t>(_names.size(), message->technology + std::size_t{1}));
+            _names[message->technology] = technologyOf(*message, _reader);
+        }
         const std::string& name = _override.empty() ? _names[message->technology] : _override;
         std::optional<LoggedMessage> masked = _mask.mask(*std::move(message), name);
         if (!masked)

@@ -182,28 +182,58 @@ bool MessageMask::shiftStamp(Buffer& bytes, std::size_t offset) const {
     return shifted != stamp;
 }
 
-bool MessageMask::maskPayload(Buffer& bytes, std::size_t offset, PropertyListKind kind) {
-    const Bytes payload = Bytes(bytes).subspan(offset);
+MaskedPayloads::Entry MessageMask::maskedPayload(Bytes payload, PropertyListKind kind) {
+    MaskedPayloads::Entry entry;
+    const auto before = _report.counts;
     Result<Value> list = readPropertyList(payload, messageLimits);
-    if (!list)
-        return clear(bytes, offset, Masked::Malformed);
-    if (!_propertyLists.mask(*list, kind, _shift.shift()))
-        return false;
-    Buffer masked;
-    if (!list->isNone()) {
-        if (isBinary(payload)) {
+    if (!list) {
+        entry.masked.assign(payload.begin(), payload.end());
+        entry.isChanged = clear(entry.masked, 0, Masked::Malformed);
+    } else if (_propertyLists.mask(*list, kind, _shift.shift())) {
+        entry.isChanged = true;
+        if (!list->isNone() && isBinary(payload)) {
             if (auto written = writeBinaryPropertyList(*list))
-                masked = *std::move(written);
-        } else if (const auto written = writeXMLPropertyList(*list)) {
-            masked.assign(written->begin(), written->end());
+                entry.masked = *std::move(written);
+        } else if (!list->isNone()) {
+            if (const auto written = writeXMLPropertyList(*list))
+                entry.masked.assign(written->begin(), written->end());
+        }
+        // Nothing is worth a file that grows without limit; such a list shares values, or has no white space.
+        if (entry.masked.empty() || entry.masked.size() > 2 * payload.size()) {
+            const bool isArray = kind == PropertyListKind::Cells || kind == PropertyListKind::Contexts;
+            const std::string_view empty = isArray ? emptyArray : emptyDictionary;
+            entry.masked.assign(empty.begin(), empty.end());
         }
     }
-    // Nothing is worth a file that grows without limit; such a list shares values, or has no white space.
-    const bool isArray = kind == PropertyListKind::Cells || kind == PropertyListKind::Contexts;
-    if (masked.empty() || masked.size() > 2 * payload.size()) {
-        const std::string_view empty = isArray ? emptyArray : emptyDictionary;
-        masked.assign(empty.begin(), empty.end());
+    for (std::size_t i = 0; i < maskedCount; ++i)
+        entry.counts[i] = _report.counts[i] - before[i];
+    return entry;
+}
+
+bool MessageMask::maskPayload(Buffer& bytes, std::size_t offset, PropertyListKind kind) {
+    const Bytes payload = Bytes(bytes).subspan(offset);
+    const MaskedPayloads::Entry* known = _payloads.find(kind, payload);
+    MaskedPayloads::Entry made;
+    if (known) {
+        for (std::size_t i = 0; i < maskedCount; ++i)
+            _report.counts[i] += known->counts[i];
+    } else {
+        made = maskedPayload(payload, kind);
+        known = &made;
     }
+    if (!known->isChanged) {
+        if (known == &made)
+            _payloads.add(kind, payload, std::move(made));
+        return false;
+    }
+    const Buffer original(payload.begin(), payload.end());
+    replacePayload(bytes, offset, known->masked);
+    if (known == &made)
+        _payloads.add(kind, original, std::move(made));
+    return true;
+}
+
+void MessageMask::replacePayload(Buffer& bytes, std::size_t offset, Bytes masked) {
     const std::size_t start = offset == 0 ? 0 : offset - LogMessage::headerLength;
     constexpr std::size_t longest = std::numeric_limits<std::uint16_t>::max();
     const auto lengthOf = [&] { return std::min(bytes.size() - start - LogMessage::lengthOffset, longest); };
@@ -216,7 +246,6 @@ bool MessageMask::maskPayload(Buffer& bytes, std::size_t offset, PropertyListKin
         bytes[start + LogMessage::lengthOffset] = static_cast<std::uint8_t>(length);
         bytes[start + LogMessage::lengthOffset + 1] = static_cast<std::uint8_t>(length >> 8);
     }
-    return true;
 }
 
 } // namespace velmora

@@ -4,6 +4,7 @@
 #pragma once
 
 #include "Export/Masking/MaskReport.h"
+#include "Export/Masking/MaskedPayloads.h"
 #include "Export/Masking/PropertyListMask.h"
 #include "Export/Masking/Pseudonyms.h"
 #include "Export/Masking/RecordMask.h"
@@ -48,6 +49,8 @@ private:
     [[nodiscard]] bool maskBytes(Buffer& bytes, Technology& technology, Time arrival);
     [[nodiscard]] bool maskRecord(Buffer& bytes, Technology& technology, Time arrival);
     [[nodiscard]] bool maskPayload(Buffer& bytes, std::size_t offset, PropertyListKind kind);
+    [[nodiscard]] MaskedPayloads::Entry maskedPayload(Bytes payload, PropertyListKind kind);
+    static void replacePayload(Buffer& bytes, std::size_t offset, Bytes masked);
     [[nodiscard]] bool clear(Buffer& bytes, std::size_t from, Masked what);
     [[nodiscard]] bool shiftStamp(Buffer& bytes, std::size_t offset) const;
 
@@ -55,6 +58,7 @@ private:
     Pseudonyms _pseudonyms;
     MaskReport _report;
     PropertyListMask _propertyLists;
+    MaskedPayloads _payloads;
     TimeShift _shift;
     std::map<std::string, std::unique_ptr<Technology>, std::less<>> _technologies;
 };

@@ -4,6 +4,7 @@
 #include "Export/Masking/SealedFile.h"
 
 #include "Export/Masking/MaskKey.h"
+#include "Export/Masking/TechnologyName.h"
 #include "LogMessages/DLFVersionReport.h"
 #include "PropertyLists/PropertyList.h"
 #include "Recording/Files/GzipSource.h"
@@ -59,7 +60,7 @@ std::optional<MaskSeal> sealOfRecording(ChunkedInput input) {
     (*reader)->setReadsAllTechnologies(true);
     MessageDigest digest;
     while (const auto message = (*reader)->next())
-        digest.add((*reader)->technologies()[message->technology], message->message.bytes());
+        digest.add(technologyOf(*message, **reader), message->message.bytes());
     const std::optional<MaskSeal> seal = recording.seal();
     const bool isWhole = (*reader)->lossTotals().losses == 0 && !(*reader)->failure();
     return seal && isWhole && seal->digest == digest.text() ? seal : std::nullopt;

@@ -6,6 +6,7 @@
 #include "Export/Masking/KnownValues.h"
 #include "Export/Masking/MessageMask.h"
 #include "Export/Masking/SealedFile.h"
+#include "Export/Masking/TechnologyName.h"
 #include "Platform/Linux/Files/Files.h"
 #include "PropertyLists/PropertyList.h"
 #include "Recording/Files/GzipSource.h"
@@ -129,7 +130,7 @@ Result<MaskReport> identitiesLeft(const MaskCommandOptions& options, bool& isWho
     MessageMask mask(masking);
     (*reader)->setReadsAllTechnologies(true);
     while (const auto message = (*reader)->next()) {
-        const std::string name = (*reader)->technologies()[message->technology];
+        const std::string name = technologyOf(*message, **reader);
         static_cast<void>(mask.mask(*message, name.empty() ? options.technology : name));
     }
     MaskReport report = mask.report();
