@@ -11,6 +11,7 @@
 #include "Tools/Events/EventsOptions.h"
 #include "Tools/Fields/FieldsOptions.h"
 #include "Tools/Info/InfoOptions.h"
+#include "Tools/Mask/MaskCommandOptions.h"
 #include "Tools/Record/RecordOptions.h"
 #include "Tools/Rules/RulesOptions.h"
 #include "Tools/Stats/StatsOptions.h"

@@ -16,6 +16,7 @@
 #include "Tools/Info/InfoCommand.h"
 #include "Tools/Log/DecoderLog.h"
 #include "Tools/Log/QuietConsole.h"
+#include "Tools/Mask/MaskCommand.h"
 #include "Tools/Output.h"
 #include "Tools/Record/RecordCommand.h"
 #include "Tools/Report.h"
@@ -63,6 +64,8 @@ int run(const CommandLine& line, DecoderLines& lines, Output& output) {
         return runFields(*fields, output);
     if (const auto* rules = std::get_if<RulesOptions>(&line.command))
         return runRules(*rules, output);
+    if (const auto* mask = std::get_if<MaskCommandOptions>(&line.command))
+        return runMask(*mask, output);
     return runConvert(std::get<ConvertOptions>(line.command));
 }
 

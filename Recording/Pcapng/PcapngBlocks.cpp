@@ -78,9 +78,10 @@ void appendPart(Buffer& buffer, std::size_t offset, Bytes part) {
 
 } // namespace
 
-void appendSection(Buffer& buffer) {
+void appendSection(Buffer& buffer, std::string_view comment) {
+    const std::size_t commentSize = comment.empty() ? 0 : optionSize(comment.size());
     const auto sectionLength =
-        static_cast<std::uint32_t>(24 + optionSize(application.size()) + optionSize(0) + 4);
+        static_cast<std::uint32_t>(24 + commentSize + optionSize(application.size()) + optionSize(0) + 4);
     put32(buffer, BlockType::SectionHeader);
     put32(buffer, sectionLength);
     put32(buffer, pcapng::byteOrderMagic);
@@ -88,6 +89,8 @@ void appendSection(Buffer& buffer) {
     put16(buffer, 0);
     put32(buffer, 0xFFFFFFFF); // the section's length is not known beforehand
     put32(buffer, 0xFFFFFFFF);
+    if (!comment.empty())
+        putOption(buffer, Option::Comment, comment);
     putOption(buffer, Option::SectionUserApplication, application);
     putOption(buffer, Option::End, std::string_view());
     put32(buffer, sectionLength);
@@ -107,13 +110,13 @@ void appendInterface(Buffer& buffer, std::string_view technology) {
     put32(buffer, interfaceLength);
 }
 
-void appendPacket(Buffer& buffer, Time time, Bytes message) {
+void appendPacket(Buffer& buffer, Time time, Bytes message, std::uint32_t interface) {
     const auto stamp = static_cast<std::uint64_t>(std::max<std::int64_t>(time.time_since_epoch().count(), 0));
     const Bytes first = message.first(std::min(message.size(), pcapng::longestPart));
     const auto length = static_cast<std::uint32_t>(packetOverhead + pcapng::padded(first.size()));
     put32(buffer, BlockType::EnhancedPacket);
     put32(buffer, length);
-    put32(buffer, 0); // the interface
+    put32(buffer, interface);
     put32(buffer, static_cast<std::uint32_t>(stamp >> 32));
     put32(buffer, static_cast<std::uint32_t>(stamp));
     put32(buffer, static_cast<std::uint32_t>(first.size()));
@@ -123,6 +126,19 @@ void appendPacket(Buffer& buffer, Time time, Bytes message) {
     for (std::size_t offset = first.size(); offset < message.size(); offset += pcapng::longestPart)
         appendPart(buffer, offset,
                    message.subspan(offset, std::min(message.size() - offset, pcapng::longestPart)));
+}
+
+void appendComment(Buffer& buffer, std::string_view comment) {
+    const auto length =
+        static_cast<std::uint32_t>(pcapng::blockOverhead + 12 + optionSize(comment.size()) + optionSize(0));
+    put32(buffer, BlockType::InterfaceStatistics);
+    put32(buffer, length);
+    put32(buffer, 0); // the interface
+    put32(buffer, 0); // the time, of nothing that counts
+    put32(buffer, 0);
+    putOption(buffer, Option::Comment, comment);
+    putOption(buffer, Option::End, std::string_view());
+    put32(buffer, length);
 }
 
 std::size_t packetSize(std::size_t messageSize) {

@@ -16,16 +16,20 @@
 /// rest of a long one in blocks after it.
 namespace velmora::pcapngBlocks {
 
-/// Adds the section header.
-void appendSection(std::vector<std::uint8_t>& buffer);
+/// Adds the section header, with a comment of at most 65535 bytes where that is not empty.
+void appendSection(std::vector<std::uint8_t>& buffer, std::string_view comment = {});
 
 /// Adds the interface description. Precondition: `technology` has at most 65535 bytes.
 void appendInterface(std::vector<std::uint8_t>& buffer, std::string_view technology);
 
 /// Adds a message's block, and those of its further parts where it is long (see pcapng::longestPart). A time
 /// before 1970 cannot be written and becomes 1970-01-01. Precondition: the message is not above
-/// `maximumMessageSize`.
-void appendPacket(std::vector<std::uint8_t>& buffer, Time time, Bytes message);
+/// `maximumMessageSize`. `interface`: the number of its interface description, from 0.
+void appendPacket(std::vector<std::uint8_t>& buffer, Time time, Bytes message, std::uint32_t interface = 0);
+
+/// Adds a block of statistics of the first interface, which holds nothing but a comment. Precondition: that
+/// has at most 65535 bytes.
+void appendComment(std::vector<std::uint8_t>& buffer, std::string_view comment);
 
 /// The length of a message's blocks.
 [[nodiscard]] std::size_t packetSize(std::size_t messageSize);

@@ -174,6 +174,14 @@ _velmora_log() {
         _velmora_offer "${_velmora_technologies[@]}" GSM CDMA LTE UTRAN
         return
         ;;
+    --level)
+        _velmora_offer identity location all
+        return
+        ;;
+    --key | --new-key | --known)
+        _filedir
+        return
+        ;;
     --select)
         _velmora_path
         return
@@ -191,7 +199,7 @@ _velmora_log() {
         if [[ $cur == -* ]]; then
             _velmora_offer "${options[@]}" --version
         else
-            _velmora_offer decode watch record convert info fields events stats diff rules
+            _velmora_offer decode watch record convert info fields events rules stats diff mask
         fi
         return
         ;;
@@ -205,6 +213,7 @@ _velmora_log() {
         --no-rules --exec --exec-timeout --fail-on --duration --count --timeout) ;;
     stats) options+=(--format --safe --histogram --by --select --role --from --to --clock --technology) ;;
     diff) options+=(--format --display --select --role --clock --technology) ;;
+    mask) options+=(--level --key --technology --keep-unknown --report --force --new-key --check --known) ;;
     esac
     if [[ $cur == -* ]]; then
         _velmora_offer "${options[@]}"
@@ -214,7 +223,9 @@ _velmora_log() {
     case $command:$files in
     rules:0) _velmora_offer check test ;;
     rules:*) _filedir toml ;;
-    decode:* | info:* | events:* | stats:* | record:0 | convert:[01] | diff:[01]) _filedir '@(pcapng|velmora|dlf)' ;;
+    decode:* | info:* | events:* | stats:* | record:0 | convert:[01] | diff:[01] | mask:[01])
+        _filedir '@(pcapng|velmora|dlf)'
+        ;;
     esac
 }
 

@@ -10,16 +10,14 @@
 #include "Tools/Decode/Refreshes.h"
 #include "Tools/ExitStatus.h"
 #include "Tools/Messages/TechnologyChoice.h"
+#include "Tools/OutputGuard.h"
 #include "Tools/OverwriteTarget.h"
 #include "Tools/Report.h"
 
-#include <algorithm>
-#include <climits>
-#include <csignal>
 #include <filesystem>
 #include <memory>
 #include <optional>
-#include <string_view>
+#include <string>
 
 #include <sys/stat.h>
 #include <unistd.h>
@@ -29,56 +27,6 @@ namespace velmora {
 namespace {
 
 constexpr mode_t newFileMode = S_IRUSR | S_IWUSR;
-
-/// The name of the file that a signal which ends the program has to remove; a signal handler needs it global.
-char nameToRemove[PATH_MAX];
-
-void removeAndExit(int number) {
-    ::unlink(nameToRemove);
-    ::signal(number, SIG_DFL);
-    ::raise(number);
-}
-
-/// While it lives, a signal from the user removes the file before it ends the program.
-class RemovedWhenInterrupted {
-public:
-    explicit RemovedWhenInterrupted(std::string_view name) {
-        if (name.size() >= sizeof nameToRemove)
-            return;
-        *std::copy(name.begin(), name.end(), nameToRemove) = '\0';
-        handle(removeAndExit);
-    }
-    ~RemovedWhenInterrupted() { handle(SIG_DFL); }
-    RemovedWhenInterrupted(const RemovedWhenInterrupted&) = delete;
-    RemovedWhenInterrupted& operator=(const RemovedWhenInterrupted&) = delete;
-
-private:
-    static void handle(void (*handler)(int)) {
-        for (const int number : {SIGHUP, SIGINT, SIGTERM})
-            // A signal that was ignored when the program started stays ignored.
-            if (::signal(number, handler) == SIG_IGN)
-                ::signal(number, SIG_IGN);
-    }
-};
-
-bool isSameFile(const struct stat& a, const struct stat& b) {
-    return a.st_dev == b.st_dev && a.st_ino == b.st_ino;
-}
-
-/// Why the output may not be written; empty where it may.
-std::string whyRefused(const ConvertOptions& options) {
-    struct stat out = {};
-    if (::stat(options.out.c_str(), &out) != 0)
-        return {};
-    struct stat in = {};
-    const bool hasInput =
-        (options.file == "-" ? ::fstat(STDIN_FILENO, &in) : ::stat(options.file.c_str(), &in)) == 0;
-    if (hasInput && isSameFile(in, out))
-        return options.out + " is the input, wanted another file";
-    if (!S_ISREG(out.st_mode))
-        return options.out + " is no regular file";
-    return options.force ? std::string() : fileExistsMessage(options.out);
-}
 
 /// How many refreshes the file takes; none where it is no regular file, which can be read but once.
 std::optional<std::uint64_t> refreshesOf(const std::string& file, const Conversion& conversion) {
@@ -135,7 +83,7 @@ bool convert(const ConvertOptions& options, const std::filesystem::path& target,
 } // namespace
 
 int runConvert(const ConvertOptions& options) {
-    if (const std::string reason = whyRefused(options); !reason.empty()) {
+    if (const std::string reason = whyNotWritten(options.file, options.out, options.force); !reason.empty()) {
         report(reason);
         return ExitStatus::BadInput;
     }

@@ -1,0 +1,100 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
+#include "Tests/Tools/Mask/MaskFixture.h"
+
+#include <gmock/gmock.h>
+
+#include <fstream>
+
+#include <zlib.h>
+
+namespace velmora {
+namespace {
+
+using testing::HasSubstr;
+using testing::Not;
+
+class MaskFormsTest : public MaskTest {
+protected:
+    void convert(const std::string& in, const std::string& out) {
+        ToolProcess process(tool({"convert", path(in), path(out)}));
+        EXPECT_EQ(process.exitStatus(), 0) << process.errors();
+    }
+};
+
+TEST_F(MaskFormsTest, SnapshotIsMadeOfMaskedMessages) {
+    convert("drive.pcapng", "drive.velmora");
+    ASSERT_THAT(contentOf("drive.velmora"), HasSubstr(iccid));
+    static_cast<void>(mask({"--key", path("key"), path("drive.velmora"), path("out/a.velmora")}));
+    EXPECT_EQ(cardIn("out/a.velmora"), _masked);
+    EXPECT_THAT(contentOf("out/a.velmora"), Not(HasSubstr(iccid)));
+    static_cast<void>(mask({"--check", path("out/a.velmora")}));
+    static_cast<void>(mask({"--key", path("key"), path("out/a.velmora"), path("out/b.velmora")}));
+    EXPECT_EQ(contentOf("out/a.velmora"), contentOf("out/b.velmora"));
+}
+
+TEST_F(MaskFormsTest, ChangedSnapshotIsNotSealedAnyMore) {
+    static_cast<void>(mask({path("drive.pcapng"), path("out/a.velmora")}));
+    std::string content = contentOf("out/a.velmora");
+    const std::size_t display = content.find("RR_IDLE");
+    ASSERT_NE(display, std::string::npos);
+    content.replace(display, 7, "SECRET!");
+    std::ofstream(path("changed.velmora"), std::ios::binary) << content;
+    EXPECT_THAT(mask({"--check", path("changed.velmora")}, 1).output, HasSubstr("in clear: "));
+}
+
+TEST_F(MaskFormsTest, LogIsMaskedAndSealed) {
+    convert("drive.pcapng", "drive.dlf");
+    static_cast<void>(
+        mask({"--key", path("key"), "--technology", "GSM", path("drive.dlf"), path("out/a.dlf")}));
+    EXPECT_EQ(cardIn("out/a.dlf"), _masked);
+    static_cast<void>(mask({"--check", "--technology", "GSM", path("out/a.dlf")}));
+    static_cast<void>(
+        mask({"--key", path("key"), "--technology", "GSM", path("out/a.dlf"), path("out/b.dlf")}));
+    EXPECT_EQ(contentOf("out/a.dlf"), contentOf("out/b.dlf"));
+    std::string content = contentOf("out/a.dlf");
+    content.back() = static_cast<char>(content.back() ^ 1);
+    std::ofstream(path("changed.dlf"), std::ios::binary) << content;
+    static_cast<void>(mask({"--check", "--technology", "GSM", path("changed.dlf")}, 1));
+}
+
+TEST_F(MaskFormsTest, GzippedFilesAreRead) {
+    const std::string content = contentOf("drive.pcapng");
+    gzFile packed = gzopen(path("drive.pcapng.gz").c_str(), "wb");
+    ASSERT_NE(packed, nullptr);
+    EXPECT_EQ(gzwrite(packed, content.data(), static_cast<unsigned>(content.size())),
+              static_cast<int>(content.size()));
+    EXPECT_EQ(gzclose(packed), Z_OK);
+    std::ofstream(path("known")) << iccid << "\n";
+    EXPECT_THAT(mask({"--check", path("drive.pcapng.gz"), "--known", path("known")}, 1).output,
+                HasSubstr("found: text"));
+    static_cast<void>(mask({"--key", path("key"), path("drive.pcapng.gz"), path("out/a.pcapng")}));
+    EXPECT_EQ(cardIn("out/a.pcapng"), _masked);
+}
+
+TEST_F(MaskFormsTest, StandardInputIsMasked) {
+    static_cast<void>(mask({"--key", path("key"), "-", path("out/a.pcapng")}, 0, contentOf("drive.pcapng")));
+    EXPECT_EQ(cardIn("out/a.pcapng"), _masked);
+}
+
+TEST_F(MaskFormsTest, TimesMoveAtTheLastLevel) {
+    static_cast<void>(mask({"--level", "all", path("drive.pcapng"), path("out/a.pcapng")}));
+    const std::vector<LoggedMessage> messages = messagesOf("out/a.pcapng");
+    ASSERT_EQ(messages.size(), 4U);
+    const Time epoch = std::chrono::sys_days(std::chrono::year(2000) / 1 / 1);
+    EXPECT_EQ(messages[0].time, epoch);
+    EXPECT_EQ(messages[3].time, epoch + std::chrono::milliseconds(4100));
+}
+
+TEST_F(MaskFormsTest, TechnologyThatNoFileNamesIsAsked) {
+    writeRecording("unnamed.pcapng", "", _drive);
+    EXPECT_THAT(mask({path("unnamed.pcapng"), path("out/a.pcapng")}, 1).messages,
+                HasSubstr("--technology supplies it"));
+    static_cast<void>(
+        mask({"--key", path("key"), "--technology", "GSM", path("unnamed.pcapng"), path("out/a.pcapng")}));
+    EXPECT_EQ(cardIn("out/a.pcapng"), _masked);
+}
+
+} // namespace
+} // namespace velmora
