@@ -25,9 +25,10 @@ std::string usageError(const CLI::App& app, const CLI::ParseError& error) {
         return error.what();
     const std::vector<std::string> rest = app.remaining();
     if (rest.empty())
-        return "no command, wanted decode, watch, record, convert, info or fields";
+        return "no command, wanted decode, watch, record, convert, info, fields or columns";
     return "got " + rest.front() +
-           ", wanted one of the commands decode, watch, record, convert, info and fields";
+           ", wanted one of the commands decode, watch, record, convert, info, fields and "
+           "columns";
 }
 
 } // namespace
@@ -68,12 +69,14 @@ CommandLine parseCommandLine(int count, const char* const* arguments) {
     ConvertOptions convert;
     InfoOptions info;
     FieldsOptions fields;
+    ColumnsOptions columns;
     const CLI::App* decodeCommand = addDecode(app, decode);
     const CLI::App* watchCommand = addWatch(app, watch);
     const CLI::App* recordCommand = addRecord(app, record);
     const CLI::App* convertCommand = addConvert(app, convert);
     const CLI::App* infoCommand = addInfo(app, info);
-    addFields(app, fields);
+    const CLI::App* fieldsCommand = addFields(app, fields);
+    addColumns(app, columns);
 
     try {
         app.parse(count, arguments);
@@ -98,8 +101,10 @@ CommandLine parseCommandLine(int count, const char* const* arguments) {
         line.command = convert;
     else if (infoCommand->parsed())
         line.command = info;
-    else
+    else if (fieldsCommand->parsed())
         line.command = fields;
+    else
+        line.command = columns;
     return line;
 }
 

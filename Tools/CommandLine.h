@@ -5,6 +5,7 @@
 
 #include "Platform/Linux/ProgramLog.h"
 #include "Platform/SystemLog.h"
+#include "Tools/Columns/ColumnsOptions.h"
 #include "Tools/Convert/ConvertOptions.h"
 #include "Tools/Decode/DecodeOptions.h"
 #include "Tools/Fields/FieldsOptions.h"
@@ -30,7 +31,7 @@ struct CommandLine {
     bool verbose =
         false; ///< decoder lines as they arise, not summed up; those of objects made and destroyed too
     std::variant<Notice, DecodeOptions, WatchOptions, RecordOptions, ConvertOptions, InfoOptions,
-                 FieldsOptions>
+                 FieldsOptions, ColumnsOptions>
         command;
 };
 

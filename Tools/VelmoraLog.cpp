@@ -6,6 +6,7 @@
 #include "Platform/Console.h"
 #include "Platform/Linux/Files/FileResources.h"
 #include "Platform/Linux/StandardDescriptors.h"
+#include "Tools/Columns/ColumnsCommand.h"
 #include "Tools/CommandLine.h"
 #include "Tools/Convert/ConvertCommand.h"
 #include "Tools/Decode/DecodeCommand.h"
@@ -46,6 +47,8 @@ int run(const CommandLine& line, DecoderLines& lines, Output& output) {
         return runWatch(*watch, lines, output);
     if (const auto* record = std::get_if<RecordOptions>(&line.command))
         return runRecord(*record, lines);
+    if (const auto* columns = std::get_if<ColumnsOptions>(&line.command))
+        return runColumns(*columns, lines, output);
     const DecoderLog log(lines);
     if (const auto* info = std::get_if<InfoOptions>(&line.command))
         return runInfo(*info, output);

@@ -1,0 +1,146 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
+#include "Tools/Columns/ColumnsCommand.h"
+
+#include "Platform/PrintableText.h"
+#include "Recording/OpenMessages.h"
+#include "Tools/Columns/ColumnFiles.h"
+#include "Tools/Columns/ColumnsObserver.h"
+#include "Tools/Columns/HashedInput.h"
+#include "Tools/ExitStatus.h"
+#include "Tools/Log/DecoderLog.h"
+#include "Tools/LogOverride.h"
+#include "Tools/Output.h"
+#include "Tools/Report.h"
+
+#include <filesystem>
+#include <memory>
+#include <optional>
+#include <string>
+
+namespace velmora {
+
+namespace {
+
+/// What became of a file, for the user.
+struct Outcome {
+    std::string text;
+    bool isGood = false;
+};
+
+Outcome failed(const std::string& title, const std::string& reason) {
+    report(title + ": " + reason);
+    return {"failed", false};
+}
+
+Result<std::unique_ptr<MessageReader>> openAgain(const HashedInput& input) {
+    Result<FileDescriptor> again = input.reopen();
+    if (!again)
+        return Failure{again.reason()};
+    const int owned = ::dup(again->get());
+    return openMessages(ChunkedInput(std::make_unique<FileSource>(owned, true)));
+}
+
+/// What the names of a file's tables follow from: its first message.
+struct Begin {
+    std::optional<Time> first;
+    std::string technology; ///< empty where the file does not name it
+};
+
+Result<Begin> beginOf(const HashedInput& input) {
+    const Result<std::unique_ptr<MessageReader>> reader = openAgain(input);
+    if (!reader)
+        return Failure{reader.reason()};
+    (*reader)->setReadsAllTechnologies(true);
+    Begin begin;
+    if (const std::optional<LoggedMessage> message = (*reader)->next())
+        begin.first = message->time;
+    begin.technology = (*reader)->technology();
+    return begin;
+}
+
+InputFile fileOf(const std::string& path, const HashedInput& input, const MessageReader& reader) {
+    InputFile file;
+    file.hash = input.hash();
+    file.name = path;
+    file.form = reader.form();
+    file.size = input.size();
+    file.losses = reader.lossTotals().losses;
+    file.lostBytes = reader.lossTotals().bytes;
+    file.isComplete = file.losses == 0 && !reader.failure();
+    return file;
+}
+
+/// Decodes a file and writes its tables.
+Outcome writeFile(const std::string& path, const HashedInput& input, const Begin& begin,
+                  const ColumnsOptions& options, DecoderLines& lines) {
+    const std::string title = fileTitle(path);
+    const Result<std::unique_ptr<MessageReader>> reader = openAgain(input);
+    if (!reader)
+        return failed(title, reader.reason());
+    ColumnFiles files(options.out, dateOf(begin.first), input.hash());
+    InputColumns columns(fileOf(path, input, **reader), files);
+    ColumnsObserver observer(columns);
+    const auto sumUp = [&] { lines.report(options.files.size() > 1 ? printable(title) : std::string()); };
+    WorkContext context(title, [&] {
+        files.discard();
+        sumUp();
+    });
+    DecodingRequest request;
+    if (begin.technology.empty())
+        request.technology = options.technology;
+    const DecoderLog log(lines);
+    const Result<DecodedFile> decoded = decodeMessages(**reader, request, context, observer);
+    if (!decoded) {
+        static_cast<void>(reportLosses(**reader, title));
+        sumUp();
+        return failed(title, decoded.reason());
+    }
+    const bool allDecoded = decoded->undecoded.report(title);
+    const bool whole = reportLosses(**reader, title);
+    sumUp();
+    Result<Done> written = columns.finish(fileOf(path, input, **reader));
+    if (written && input.hasGrown())
+        written = Failure{"has been written to while it was read"};
+    if (written)
+        written = files.commit();
+    if (!written)
+        return failed(title, written.reason());
+    return {std::string(allDecoded && whole ? "written" : "written with losses") + ": " +
+                std::to_string(columns.tables()) + " tables, " + std::to_string(columns.rows()) + " rows, " +
+                std::to_string(files.bytes()) + " bytes",
+            allDecoded && whole};
+}
+
+Outcome takeFile(const std::string& path, const ColumnsOptions& options, DecoderLines& lines) {
+    const std::string title = fileTitle(path);
+    const Result<HashedInput> input = HashedInput::open(path);
+    if (!input)
+        return failed(title, input.reason());
+    const Result<Begin> begin = beginOf(*input);
+    if (!begin)
+        return failed(title, begin.reason());
+    const std::string& technology = begin->technology.empty() ? options.technology : begin->technology;
+    const std::filesystem::path mark =
+        options.out / partitionOf("files", technology, dateOf(begin->first)) / (input->hash() + ".parquet");
+    std::error_code error;
+    if (std::filesystem::exists(mark, error))
+        return {"there already", true};
+    return writeFile(path, *input, *begin, options, lines);
+}
+
+} // namespace
+
+int runColumns(const ColumnsOptions& options, DecoderLines& lines, Output& output) {
+    bool good = true;
+    for (const std::string& path : options.files) {
+        const Outcome outcome = takeFile(path, options, lines);
+        good = good && outcome.isGood;
+        output.put(printable(fileTitle(path)) + ": " + outcome.text + "\n");
+        output.flush();
+    }
+    return good && output.state() != Output::State::Failed ? ExitStatus::Done : ExitStatus::BadInput;
+}
+
+} // namespace velmora

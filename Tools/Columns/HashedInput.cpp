@@ -1,0 +1,100 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
+#include "Tools/Columns/HashedInput.h"
+
+#include "Platform/Linux/Errno.h"
+#include "Platform/Linux/Files/Files.h"
+#include "Recording/Files/FileSource.h"
+
+#include <xxhash.h>
+
+#include <array>
+#include <cerrno>
+#include <cstdlib>
+#include <memory>
+#include <vector>
+
+#include <fcntl.h>
+#include <sys/stat.h>
+#include <unistd.h>
+
+namespace velmora {
+
+namespace {
+
+constexpr std::size_t bufferSize = std::size_t{256} << 10;
+
+struct FreeState {
+    void operator()(XXH3_state_t* state) const { XXH3_freeState(state); }
+};
+
+std::string digitsOf(const XXH128_hash_t& hash) {
+    XXH128_canonical_t canonical;
+    XXH128_canonicalFromHash(&canonical, hash);
+    constexpr std::string_view digits = "0123456789abcdef";
+    std::string text;
+    for (const unsigned char byte : canonical.digest) {
+        text += digits[byte >> 4U];
+        text += digits[byte & 0xFU];
+    }
+    return text;
+}
+
+FileDescriptor temporaryFile() {
+    const char* const directory = std::getenv("TMPDIR");
+    return FileDescriptor(
+        ::open(directory && *directory ? directory : "/tmp", O_TMPFILE | O_RDWR | O_CLOEXEC, 0600));
+}
+
+} // namespace
+
+Result<HashedInput> HashedInput::open(const std::string& path) {
+    FileDescriptor file(path == "-" ? ::dup(STDIN_FILENO) : ::open(path.c_str(), O_RDONLY | O_CLOEXEC));
+    if (!file)
+        return Failure{"cannot open: " + errnoText(errno)};
+    struct stat status = {};
+    FileDescriptor copy;
+    if (::fstat(file.get(), &status) != 0 || !S_ISREG(status.st_mode) ||
+        ::lseek(file.get(), 0, SEEK_CUR) != 0) {
+        copy = temporaryFile();
+        if (!copy)
+            return Failure{"cannot be kept for reading it twice: " + errnoText(errno)};
+    }
+    const std::unique_ptr<XXH3_state_t, FreeState> state(XXH3_createState());
+    XXH3_128bits_reset(state.get());
+    std::vector<std::uint8_t> buffer(bufferSize);
+    std::uint64_t size = 0;
+    FileSource source(file.get(), false);
+    for (;;) {
+        const Result<std::size_t> count = source.read(buffer);
+        if (!count)
+            return Failure{count.reason()};
+        if (*count == 0)
+            break;
+        const Bytes part = Bytes(buffer).first(*count);
+        XXH3_128bits_update(state.get(), part.data(), part.size());
+        size += part.size();
+        if (copy)
+            if (const Result<Done> written = writeAll(copy.get(), part); !written)
+                return Failure{"cannot be kept for reading it twice: " + written.reason()};
+    }
+    return HashedInput(copy ? std::move(copy) : std::move(file), digitsOf(XXH3_128bits_digest(state.get())),
+                       size);
+}
+
+Result<FileDescriptor> HashedInput::reopen() const {
+    // A descriptor of its own position, not a copy that shares it.
+    FileDescriptor again(
+        ::open(("/proc/self/fd/" + std::to_string(_file.get())).c_str(), O_RDONLY | O_CLOEXEC));
+    if (!again)
+        return Failure{"cannot open: " + errnoText(errno)};
+    return again;
+}
+
+bool HashedInput::hasGrown() const {
+    struct stat status = {};
+    return ::fstat(_file.get(), &status) != 0 || static_cast<std::uint64_t>(status.st_size) != _size;
+}
+
+} // namespace velmora
