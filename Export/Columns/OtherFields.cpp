@@ -18,6 +18,7 @@ struct Column {
     static constexpr std::size_t text = raw + 1;
     static constexpr std::size_t flag = text + 1;
     static constexpr std::size_t data = flag + 1;
+    static constexpr std::size_t shown = data + 1;
 };
 
 } // namespace
@@ -32,6 +33,7 @@ TableLayout OtherFields::layout(std::string_view technology) {
     layout.add("value_text", StoredType::Text, ValueMeaning::Text);
     layout.add("value_flag", StoredType::Boolean);
     layout.add("value_data", StoredType::Text);
+    layout.add("shown_text", StoredType::Text, ValueMeaning::Text);
     return layout;
 }
 
@@ -64,9 +66,9 @@ std::size_t OtherFields::add(const RowContext& context, const Observation& obser
             .setText(row,
                      {reinterpret_cast<const char*>(observation.bytes.data()), observation.bytes.size()});
         break;
-    case ObservedKind::Absent: break;
+    case ObservedKind::Absent: setText(Column::shown, _text.of(observation)); break;
     }
-    return _path.size() + observation.words.size() + observation.bytes.size();
+    return _path.size() + observation.words.size() + observation.given.size() + observation.bytes.size();
 }
 
 } // namespace velmora

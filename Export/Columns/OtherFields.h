@@ -12,7 +12,8 @@
 namespace velmora {
 
 /// The table of what no column is for: fields that messages name themselves, and values of another kind than
-/// the field's. A row has the path and the value, whatever its kind.
+/// the field's. A row has the path and the value, whatever its kind, or
+/// what is shown where there is none.
 class OtherFields {
 public:
     [[nodiscard]] static TableLayout layout(std::string_view technology);

@@ -155,7 +155,9 @@ void ColumnBuilder::addValues(EncodedChunk& chunk) {
         }
         break;
     }
-    chunk.statistics.range = range.result();
+    // Bytes that are no text have none: readers take the ends of their range for texts.
+    if (_column.schema.type != StoredType::Text || _column.schema.meaning == ValueMeaning::Text)
+        chunk.statistics.range = range.result();
 }
 
 void ColumnBuilder::addIndices(EncodedChunk& chunk, std::size_t entries) const {

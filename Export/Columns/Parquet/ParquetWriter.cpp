@@ -3,19 +3,10 @@
 
 #include "Export/Columns/Parquet/ParquetWriter.h"
 
-#include "Export/Columns/Parquet/BitPacking.h"
 #include "Export/Columns/Parquet/PageHeader.h"
 #include "Export/Columns/Parquet/Parquet.h"
 
 namespace velmora {
-
-namespace {
-
-Bytes bytesOf(std::string_view text) {
-    return {reinterpret_cast<const std::uint8_t*>(text.data()), text.size()};
-}
-
-} // namespace
 
 ParquetWriter::ParquetWriter(const std::vector<TableColumn>& columns,
                              std::vector<std::pair<std::string, std::string>> properties, ByteSink& sink,
@@ -46,7 +37,7 @@ Result<Done> ParquetWriter::cut() {
     if (_rows == 0)
         return Done();
     if (_offset == 0)
-        if (Result<Done> begun = write(bytesOf(parquet::magic)); !begun)
+        if (Result<Done> begun = write(parquet::bytesOf(parquet::magic)); !begun)
             return begun;
     RowGroupMetadata group;
     group.rows = _rows;
@@ -87,7 +78,7 @@ Result<Done> ParquetWriter::writePage(const std::vector<std::uint8_t>& content, 
         serialized(PageHeader{isDictionary, encoding, values, compressed.size(), content.size()});
     chunk.size += header.size() + compressed.size();
     chunk.uncompressedSize += header.size() + content.size();
-    if (Result<Done> written = write(bytesOf(header)); !written)
+    if (Result<Done> written = write(parquet::bytesOf(header)); !written)
         return written;
     return write(compressed);
 }
@@ -95,14 +86,10 @@ Result<Done> ParquetWriter::writePage(const std::vector<std::uint8_t>& content, 
 Result<Done> ParquetWriter::finish() {
     if (Result<Done> last = cut(); !last)
         return last;
-    std::vector<std::uint8_t> end;
     if (_offset == 0)
-        end.insert(end.end(), parquet::magic.begin(), parquet::magic.end());
-    const std::string metadata = serialized(_metadata);
-    end.insert(end.end(), metadata.begin(), metadata.end());
-    appendFixed(end, static_cast<std::uint32_t>(metadata.size()));
-    end.insert(end.end(), parquet::magic.begin(), parquet::magic.end());
-    return write(end);
+        if (Result<Done> begun = write(parquet::bytesOf(parquet::magic)); !begun)
+            return begun;
+    return write(parquet::endOf(_metadata));
 }
 
 } // namespace velmora
