@@ -7,7 +7,9 @@
 #include "Recording/OpenMessages.h"
 #include "Tools/Columns/ColumnFiles.h"
 #include "Tools/Columns/ColumnsObserver.h"
+#include "Tools/Columns/Compaction.h"
 #include "Tools/Columns/HashedInput.h"
+#include "Tools/Columns/JoinedFiles.h"
 #include "Tools/ExitStatus.h"
 #include "Tools/Log/DecoderLog.h"
 #include "Tools/LogOverride.h"
@@ -17,7 +19,9 @@
 #include <filesystem>
 #include <memory>
 #include <optional>
+#include <set>
 #include <string>
+#include <system_error>
 
 namespace velmora {
 
@@ -113,7 +117,8 @@ Outcome writeFile(const std::string& path, const HashedInput& input, const Begin
             allDecoded && whole};
 }
 
-Outcome takeFile(const std::string& path, const ColumnsOptions& options, DecoderLines& lines) {
+Outcome takeFile(const std::string& path, const ColumnsOptions& options, WrittenInputs& written,
+                 DecoderLines& lines) {
     const std::string title = fileTitle(path);
     const Result<HashedInput> input = HashedInput::open(path);
     if (!input)
@@ -122,25 +127,62 @@ Outcome takeFile(const std::string& path, const ColumnsOptions& options, Decoder
     if (!begin)
         return failed(title, begin.reason());
     const std::string& technology = begin->technology.empty() ? options.technology : begin->technology;
-    const std::filesystem::path mark =
-        options.out / partitionOf("files", technology, dateOf(begin->first)) / (input->hash() + ".parquet");
-    std::error_code error;
-    if (std::filesystem::exists(mark, error))
+    if (written.contains(options.out / partitionOf("files", technology, dateOf(begin->first)), input->hash()))
         return {"there already", true};
     return writeFile(path, *input, *begin, options, lines);
+}
+
+int writeAllFiles(const ColumnsOptions& options, DecoderLines& lines, Output& output) {
+    bool good = true;
+    WrittenInputs written;
+    for (const std::string& path : options.files) {
+        const Outcome outcome = takeFile(path, options, written, lines);
+        good = good && outcome.isGood;
+        output.put(printable(fileTitle(path)) + ": " + outcome.text + "\n");
+        output.flush();
+    }
+    return good ? ExitStatus::Done : ExitStatus::BadInput;
+}
+
+/// The directories of a table, a technology and a day.
+Result<std::set<std::filesystem::path>> partitionsIn(const std::filesystem::path& root) {
+    std::set<std::filesystem::path> partitions;
+    std::error_code error;
+    constexpr int depth = 2; // of the day below the table
+    for (std::filesystem::recursive_directory_iterator each(root, error), end; !error && each != end;
+         each.increment(error))
+        if (each.depth() == depth && each->is_directory(error) &&
+            each->path().filename().string().starts_with("date="))
+            partitions.insert(each->path());
+    if (error)
+        return Failure{"cannot be read: " + error.message()};
+    return partitions;
+}
+
+int compactAll(const std::filesystem::path& root, Output& output) {
+    const Result<std::set<std::filesystem::path>> partitions = partitionsIn(root);
+    if (!partitions) {
+        report(root.string() + ": " + partitions.reason());
+        return ExitStatus::BadInput;
+    }
+    bool good = true;
+    for (const std::filesystem::path& partition : *partitions) {
+        Compaction compaction(partition, [](const std::string& problem) { report(problem); });
+        good = compaction.run() && good;
+        if (compaction.removed() > 0)
+            output.put(printable(partition.string()) + ": " + std::to_string(compaction.removed()) +
+                       " files joined in " + std::to_string(compaction.made()) + "\n");
+        output.flush();
+    }
+    return good ? ExitStatus::Done : ExitStatus::BadInput;
 }
 
 } // namespace
 
 int runColumns(const ColumnsOptions& options, DecoderLines& lines, Output& output) {
-    bool good = true;
-    for (const std::string& path : options.files) {
-        const Outcome outcome = takeFile(path, options, lines);
-        good = good && outcome.isGood;
-        output.put(printable(fileTitle(path)) + ": " + outcome.text + "\n");
-        output.flush();
-    }
-    return good && output.state() != Output::State::Failed ? ExitStatus::Done : ExitStatus::BadInput;
+    const int status =
+        options.compact.empty() ? writeAllFiles(options, lines, output) : compactAll(options.compact, output);
+    return output.state() == Output::State::Failed ? ExitStatus::BadInput : status;
 }
 
 } // namespace velmora

@@ -6,6 +6,7 @@
 #include "Platform/Linux/Errno.h"
 #include "Platform/Linux/Files/Files.h"
 #include "Recording/Files/FileSource.h"
+#include "Tools/Columns/TextHash.h"
 
 #include <xxhash.h>
 
@@ -48,6 +49,10 @@ FileDescriptor temporaryFile() {
 }
 
 } // namespace
+
+std::string textHash(std::string_view text) {
+    return digitsOf(XXH3_128bits(text.data(), text.size()));
+}
 
 Result<HashedInput> HashedInput::open(const std::string& path) {
     FileDescriptor file(path == "-" ? ::dup(STDIN_FILENO) : ::open(path.c_str(), O_RDONLY | O_CLOEXEC));
