@@ -24,8 +24,8 @@ TEST(CommandLineErrorsTest, UsageErrorsGiveTheFoundAndTheExpectedValue) {
         std::string message;
     };
     const Case cases[] = {
-        {{}, "no command, wanted decode, watch, record, convert, info or fields"},
-        {{"bogus"}, "got bogus, wanted one of the commands decode, watch, record, convert, info and fields"},
+        {{}, "no command, wanted decode, watch, record, convert, info, fields or columns"},
+        {{"bogus"}, "got bogus, wanted one of the commands decode, watch, record, convert, info, fields and columns"},
         {{"decode"}, "FILE is required"},
         {{"decode", "--format", "xml", "a"}, "--format: got xml, wanted text or json or jsonl or csv"},
         {{"decode", "--every", "day", "a"}, "--every: got day, wanted refresh or message"},

@@ -23,9 +23,9 @@ CLI::App* addColumns(CLI::App& app, ColumnsOptions& options) {
     addTechnologyOption(*command, options.technology, "The technology of files that do not name theirs");
     command->callback([&options] {
         if (options.out.empty() == options.compact.empty())
-            throw CLI::ValidationError("columns", "got " +
-                                                      std::string(options.out.empty() ? "neither" : "both") +
-                                                      " --out and --compact, wanted one of them");
+            throw CLI::ValidationError("columns", options.out.empty()
+                                                      ? "got neither --out nor --compact, wanted one of them"
+                                                      : "got both --out and --compact, wanted one of them");
         if (!options.out.empty() && options.files.empty())
             throw CLI::ValidationError("--out", "got no FILE, wanted at least one");
         if (!options.compact.empty() && !options.files.empty())
