@@ -106,7 +106,7 @@ _velmora_log() {
     for ((i = 1; i < cword; ++i)); do
         case ${words[i]} in
         --log | --log-level | --format | --every | --select | --from | --to | --code | --technology | --jobs | \
-            --max-age | --duration | --count | --timeout | --description | --role)
+            --max-age | --duration | --count | --timeout | --description | --role | --out | --compact)
             ((++i))
             ;;
         -?*) ;;
@@ -144,6 +144,10 @@ _velmora_log() {
         _velmora_path
         return
         ;;
+    --out | --compact)
+        _filedir -d
+        return
+        ;;
     --max-age | --from | --to | --code | --jobs | --duration | --count | --timeout | --description)
         return # nothing that could be guessed
         ;;
@@ -156,7 +160,7 @@ _velmora_log() {
         if [[ $cur == -* ]]; then
             _velmora_offer "${options[@]}" --version
         else
-            _velmora_offer decode watch record convert info fields
+            _velmora_offer decode watch record convert info fields columns
         fi
         return
         ;;
@@ -166,6 +170,7 @@ _velmora_log() {
     convert) options+=(--force --from --to --code --technology --description --strict) ;;
     info) options+=(--format --technology) ;;
     fields) options+=(--technology --role --format --safe) ;;
+    columns) options+=(--out --compact --technology) ;;
     esac
     if [[ $cur == -* ]]; then
         _velmora_offer "${options[@]}"
@@ -173,7 +178,7 @@ _velmora_log() {
     fi
     # As many files as the command takes.
     case $command:$files in
-    decode:* | info:* | record:0 | convert:[01]) _filedir '@(pcapng|velmora|dlf)' ;;
+    decode:* | info:* | columns:* | record:0 | convert:[01]) _filedir '@(pcapng|velmora|dlf)' ;;
     esac
 }
 
