@@ -25,7 +25,8 @@ TEST(CommandLineErrorsTest, UsageErrorsGiveTheFoundAndTheExpectedValue) {
     };
     const Case cases[] = {
         {{}, "no command, wanted decode, watch, record, convert, info, fields or columns"},
-        {{"bogus"}, "got bogus, wanted one of the commands decode, watch, record, convert, info, fields and columns"},
+        {{"bogus"},
+         "got bogus, wanted one of the commands decode, watch, record, convert, info, fields and columns"},
         {{"decode"}, "FILE is required"},
         {{"decode", "--format", "xml", "a"}, "--format: got xml, wanted text or json or jsonl or csv"},
         {{"decode", "--every", "day", "a"}, "--every: got day, wanted refresh or message"},
