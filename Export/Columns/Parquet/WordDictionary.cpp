@@ -8,33 +8,29 @@ namespace velmora {
 std::optional<std::uint16_t> WordDictionary::find(std::uint64_t value) {
     if (_slots.size() < 2 * (_values.size() + 1))
         grow();
-    const std::size_t slot = slotOf(value);
-    if (_slots[slot] == 0) {
+    Slot& slot = slotOf(value);
+    if (slot.number == 0) {
         if (_values.size() == mostValues)
             return std::nullopt;
         _values.push_back(value);
-        _slots[slot] = static_cast<std::uint16_t>(_values.size());
+        slot = {value, static_cast<std::uint32_t>(_values.size())};
     }
-    _last = value;
-    _lastIndex = static_cast<std::uint16_t>(_slots[slot] - 1);
-    return _lastIndex;
+    return static_cast<std::uint16_t>(slot.number - 1);
 }
 
 /// The slot that holds the value, or the free one for it.
-std::size_t WordDictionary::slotOf(std::uint64_t value) const {
-    constexpr std::uint64_t spread = 0x9E3779B97F4A7C15; // 2^64 divided by the golden ratio
-    const std::size_t mask = _slots.size() - 1;
-    std::size_t slot = static_cast<std::size_t>((value ^ value >> 29) * spread >> 32) & mask;
-    while (_slots[slot] != 0 && _values[_slots[slot] - 1U] != value)
-        slot = (slot + 1) & mask;
-    return slot;
+WordDictionary::Slot& WordDictionary::slotOf(std::uint64_t value) {
+    std::size_t slot = homeOf(value);
+    while (_slots[slot].number != 0 && _slots[slot].value != value)
+        slot = (slot + 1) & (_slots.size() - 1);
+    return _slots[slot];
 }
 
 void WordDictionary::grow() {
     constexpr std::size_t smallest = 32;
-    _slots.assign(_slots.empty() ? smallest : _slots.size() * 2, 0);
+    _slots.assign(_slots.empty() ? smallest : _slots.size() * 2, Slot());
     for (std::size_t i = 0; i < _values.size(); ++i)
-        _slots[slotOf(_values[i])] = static_cast<std::uint16_t>(i + 1);
+        slotOf(_values[i]) = {_values[i], static_cast<std::uint32_t>(i + 1)};
 }
 
 } // namespace velmora

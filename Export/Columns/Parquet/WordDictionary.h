@@ -18,23 +18,34 @@ public:
 
     /// The index of the value, which is added where there is room; absent where there is none.
     [[nodiscard]] std::optional<std::uint16_t> indexOf(std::uint64_t value) {
-        if (value == _last && !_values.empty())
-            return _lastIndex;
+        // There are millions of values, nearly all of which are where they belong.
+        if (!_slots.empty())
+            if (const Slot& slot = _slots[homeOf(value)]; slot.value == value && slot.number != 0)
+                return static_cast<std::uint16_t>(slot.number - 1);
         return find(value);
     }
     [[nodiscard]] const std::vector<std::uint64_t>& values() const { return _values; }
     /// Bytes of memory.
-    [[nodiscard]] std::size_t size() const { return _values.capacity() * 8 + _slots.capacity() * 2; }
+    [[nodiscard]] std::size_t size() const {
+        return _values.capacity() * sizeof(std::uint64_t) + _slots.capacity() * sizeof(Slot);
+    }
 
 private:
+    struct Slot {
+        std::uint64_t value = 0;
+        std::uint32_t number = 0; ///< an index and 1; 0 where the slot is free
+    };
+
+    [[nodiscard]] std::size_t homeOf(std::uint64_t value) const {
+        constexpr std::uint64_t spread = 0x9E3779B97F4A7C15; // 2^64 divided by the golden ratio
+        return static_cast<std::size_t>((value ^ value >> 29) * spread >> 32) & (_slots.size() - 1);
+    }
     [[nodiscard]] std::optional<std::uint16_t> find(std::uint64_t value);
-    [[nodiscard]] std::size_t slotOf(std::uint64_t value) const;
+    [[nodiscard]] Slot& slotOf(std::uint64_t value);
     void grow();
 
     std::vector<std::uint64_t> _values;
-    std::vector<std::uint16_t> _slots; ///< an index and 1 each; 0 where it is free
-    std::uint64_t _last = 0;
-    std::uint16_t _lastIndex = 0;
+    std::vector<Slot> _slots; ///< a power of two
 };
 
 } // namespace velmora
