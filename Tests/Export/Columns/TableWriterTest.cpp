@@ -47,8 +47,10 @@ TEST_F(TableWriterTest, hasNoValueForWhatAMessageLacks) {
     table.addRow({1, 10, 20, 0x5137}, std::array<std::uint32_t, 1>{3}, "62");
     table.addRow({2, 10});
     ASSERT_TRUE(table.finish());
+    const Result<FileMetadata> metadata = _sink.metadata();
+    ASSERT_TRUE(metadata) << metadata.reason();
     std::vector<std::uint64_t> nulls;
-    for (const ChunkMetadata& chunk : _sink.metadata()->groups.at(0).chunks)
+    for (const ChunkMetadata& chunk : metadata->groups.at(0).chunks)
         nulls.push_back(chunk.statistics.nulls);
     // file, message, time, modem_time, code, row, row_key
     EXPECT_EQ(nulls, (std::vector<std::uint64_t>{0, 0, 0, 1, 1, 1, 1}));
