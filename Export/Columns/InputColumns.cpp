@@ -54,8 +54,13 @@ void InputColumns::limitMemory() {
     std::size_t sum = 0;
     std::vector<std::pair<std::size_t, TableWriter*>> sizes;
     for (const std::unique_ptr<TechnologyTables>& technology : _technologies)
-        for (TableWriter& table : technology->tables())
-            sum += sizes.emplace_back(table.size(), &table).first;
+        for (TableWriter& table : technology->tables()) {
+            const std::size_t size = table.size();
+            if (size > mostOfTable)
+                note(table.cut());
+            else
+                sum += sizes.emplace_back(size, &table).first;
+        }
     if (sum <= mostMemory)
         return;
     std::sort(sizes.begin(), sizes.end(), [](const auto& a, const auto& b) { return a.first > b.first; });

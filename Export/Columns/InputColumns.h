@@ -34,6 +34,8 @@ public:
     /// So much memory is used for rows that are not written yet, or a little more: what one message reports
     /// is kept in any case.
     static constexpr std::size_t mostMemory = std::size_t{16} << 20;
+    /// The same of one table: of long texts, a copy that is being encoded takes as much again.
+    static constexpr std::size_t mostOfTable = std::size_t{6} << 20;
 
     InputColumns(InputFile file, TableOutputs& outputs);
 

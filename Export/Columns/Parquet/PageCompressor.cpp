@@ -5,6 +5,7 @@
 
 #include <zstd.h>
 
+#include <algorithm>
 #include <new>
 
 namespace velmora {
@@ -14,6 +15,8 @@ namespace {
 /// The fastest of the levels that are not meant for speed above all: higher ones gain little on pages that
 /// are packed already.
 constexpr int level = 1;
+
+constexpr std::size_t usualSize = std::size_t{1} << 20;
 
 } // namespace
 
@@ -34,8 +37,9 @@ PageCompressor::~PageCompressor() = default;
 
 Bytes PageCompressor::compress(Bytes page) {
     const std::size_t most = ZSTD_compressBound(page.size());
-    if (_compressed.size() < most)
-        _compressed.resize(most);
+    // A long text's page leaves no memory behind.
+    if (_compressed.size() < most || _compressed.size() > std::max(most, usualSize))
+        _compressed = std::vector<std::uint8_t>(std::max(most, usualSize));
     const std::size_t size = ZSTD_compressCCtx(_context->context, _compressed.data(), _compressed.size(),
                                                page.data(), page.size(), level);
     if (ZSTD_isError(size) != 0)
