@@ -38,12 +38,11 @@ Outcome failed(const std::string& title, const std::string& reason) {
     return {"failed", false};
 }
 
-Result<std::unique_ptr<MessageReader>> openAgain(const HashedInput& input) {
-    Result<FileDescriptor> again = input.reopen();
-    if (!again)
-        return Failure{again.reason()};
-    const int owned = ::dup(again->get());
-    return openMessages(ChunkedInput(std::make_unique<FileSource>(owned, true)));
+Result<std::unique_ptr<MessageReader>> openAgain(const HashedInput& input, InputError& error) {
+    Result<std::unique_ptr<ByteSource>> source = input.read(error);
+    if (!source)
+        return Failure{source.reason()};
+    return openMessages(ChunkedInput(*std::move(source)));
 }
 
 /// What the names of a file's tables follow from: its first message.
@@ -53,7 +52,8 @@ struct Begin {
 };
 
 Result<Begin> beginOf(const HashedInput& input) {
-    const Result<std::unique_ptr<MessageReader>> reader = openAgain(input);
+    InputError error;
+    const Result<std::unique_ptr<MessageReader>> reader = openAgain(input, error);
     if (!reader)
         return Failure{reader.reason()};
     (*reader)->setReadsAllTechnologies(true);
@@ -61,6 +61,8 @@ Result<Begin> beginOf(const HashedInput& input) {
     if (const std::optional<LoggedMessage> message = (*reader)->next())
         begin.first = message->time;
     begin.technology = (*reader)->technology();
+    if (error.reason)
+        return Failure{*error.reason};
     return begin;
 }
 
@@ -80,7 +82,8 @@ InputFile fileOf(const std::string& path, const HashedInput& input, const Messag
 Outcome writeFile(const std::string& path, const HashedInput& input, const Begin& begin,
                   const ColumnsOptions& options, DecoderLines& lines) {
     const std::string title = fileTitle(path);
-    const Result<std::unique_ptr<MessageReader>> reader = openAgain(input);
+    InputError error;
+    const Result<std::unique_ptr<MessageReader>> reader = openAgain(input, error);
     if (!reader)
         return failed(title, reader.reason());
     ColumnFiles files(options.out, dateOf(begin.first), input.hash());
@@ -105,6 +108,9 @@ Outcome writeFile(const std::string& path, const HashedInput& input, const Begin
     const bool whole = reportLosses(**reader, title);
     sumUp();
     Result<Done> written = columns.finish(fileOf(path, input, **reader));
+    // Another time it may be read to its end: what there is of it is not what the input holds.
+    if (written && error.reason)
+        return {"failed", false}; // for the reason that has been reported
     if (written && input.hasGrown())
         written = Failure{"has been written to while it was read"};
     if (written)

@@ -48,6 +48,23 @@ FileDescriptor temporaryFile() {
         ::open(directory && *directory ? directory : "/tmp", O_TMPFILE | O_RDWR | O_CLOEXEC, 0600));
 }
 
+/// Notes when a read fails.
+class NotingSource final : public ByteSource {
+public:
+    NotingSource(int descriptor, InputError& error) : _file(descriptor, true), _error(error) {}
+
+    Result<std::size_t> read(std::span<std::uint8_t> buffer) override {
+        Result<std::size_t> count = _file.read(buffer);
+        if (!count)
+            _error.reason = count.reason();
+        return count;
+    }
+
+private:
+    FileSource _file;
+    InputError& _error;
+};
+
 } // namespace
 
 std::string textHash(std::string_view text) {
@@ -88,13 +105,13 @@ Result<HashedInput> HashedInput::open(const std::string& path) {
                        size);
 }
 
-Result<FileDescriptor> HashedInput::reopen() const {
+Result<std::unique_ptr<ByteSource>> HashedInput::read(InputError& error) const {
     // A descriptor of its own position, not a copy that shares it.
-    FileDescriptor again(
-        ::open(("/proc/self/fd/" + std::to_string(_file.get())).c_str(), O_RDONLY | O_CLOEXEC));
-    if (!again)
+    const std::string path = "/proc/self/fd/" + std::to_string(_file.get());
+    const int descriptor = ::open(path.c_str(), O_RDONLY | O_CLOEXEC);
+    if (descriptor < 0)
         return Failure{"cannot open: " + errnoText(errno)};
-    return again;
+    return std::unique_ptr<ByteSource>(std::make_unique<NotingSource>(descriptor, error));
 }
 
 bool HashedInput::hasGrown() const {

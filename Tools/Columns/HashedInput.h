@@ -5,11 +5,19 @@
 
 #include "Platform/Linux/Files/FileDescriptor.h"
 #include "Platform/Result.h"
+#include "Recording/Files/ByteSource.h"
 
 #include <cstdint>
+#include <memory>
+#include <optional>
 #include <string>
 
 namespace velmora {
+
+/// Why reading an input again failed, by no fault of its content; absent while it has not.
+struct InputError {
+    std::optional<std::string> reason = {};
+};
 
 /// An input that has been read once, for its hash, and can be read again.
 class HashedInput {
@@ -21,8 +29,8 @@ public:
     /// 32 hexadecimal digits of XXH3: the same for the same content, whatever its name.
     [[nodiscard]] const std::string& hash() const { return _hash; }
     [[nodiscard]] std::uint64_t size() const { return _size; }
-    /// Another descriptor, at the beginning.
-    [[nodiscard]] Result<FileDescriptor> reopen() const;
+    /// Its bytes from the beginning. `error` must outlive the source.
+    [[nodiscard]] Result<std::unique_ptr<ByteSource>> read(InputError& error) const;
     /// Whether more has been written to it since.
     [[nodiscard]] bool hasGrown() const;
 

@@ -3,6 +3,7 @@
 """The list of cases. A new command gets its line here."""
 
 from velmora_chaos.failing.case import Case
+from velmora_chaos.failing.columns_case import ColumnsCase
 from velmora_chaos.failing.convert_case import ConvertCase
 from velmora_chaos.failing.record_case import RecordCase
 from velmora_chaos.failing.save_case import SaveCase
@@ -26,6 +27,7 @@ def all_cases() -> list[Case]:
         decode_case("two side by side", ["--jobs", "2"], "utran.pcapng", "lte.pcapng"),
         Case("info", ["info", str(RECORDINGS / "utran.pcapng")]),
         Case("fields", ["fields", "--format", "json"]),
+        ColumnsCase("lte.pcapng"),
         ConvertCase("gsm.pcapng", "drive.pcapng", had=False),
         ConvertCase("gsm.pcapng", "drive.pcapng", had=True),
         ConvertCase("c2k.pcapng", "drive.dlf", had=False),
