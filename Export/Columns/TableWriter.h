@@ -17,7 +17,7 @@ namespace velmora {
 struct RowContext {
     std::uint64_t message = 0;
     std::int64_t time = 0;                      ///< in nanoseconds since 1970
-    std::optional<std::int64_t> modemTime = {}; ///< likewise
+    std::optional<std::int64_t> modemTime = {}; ///< the same
     std::optional<std::uint32_t> code = {};
 };
 

@@ -3,14 +3,15 @@
 
 #include "Tools/Columns/Compaction.h"
 
+#include "Export/Columns/Parquet/Parquet.h"
 #include "Export/Columns/Parquet/ParquetJoin.h"
 #include "Platform/Linux/Errno.h"
 #include "Platform/Linux/Files/AtomicFile.h"
 #include "Platform/Linux/Files/FileDescriptor.h"
 #include "Platform/Linux/Files/Files.h"
+#include "Tools/Columns/ContentHash.h"
 #include "Tools/Columns/JoinedFiles.h"
 #include "Tools/Columns/ParquetFile.h"
-#include "Tools/Columns/TextHash.h"
 
 #include <algorithm>
 #include <cerrno>
@@ -118,11 +119,10 @@ std::size_t Compaction::joinFirst(const std::vector<Part>& parts) {
 }
 
 Result<Done> Compaction::join(const std::vector<Part>& parts) {
-    std::string names;
+    ContentHash names;
     for (const Part& part : parts)
-        names += part.path.filename().string() + "\n";
-    const std::filesystem::path path =
-        _directory / (std::string(joinedPrefix) + textHash(names) + ".parquet");
+        names.add(parquet::bytesOf(part.path.filename().string() + "\n"));
+    const std::filesystem::path path = _directory / (std::string(joinedPrefix) + names.digits() + ".parquet");
     const auto failed = [&path](const std::string& reason) { return Failure{path.string() + ": " + reason}; };
     Result<AtomicFile> file = AtomicFile::create(path, 0666, ".");
     if (!file)

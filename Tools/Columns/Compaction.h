@@ -25,7 +25,7 @@ public:
     /// A joined file has at most about so many chunks of columns: its metadata is read at once.
     static constexpr std::uint64_t mostChunks = 40'000;
 
-    /// `report` gets what is wrong with a file, with its name.
+    /// `report` gets the errors, each with the name of its file.
     Compaction(std::filesystem::path directory, std::function<void(const std::string&)> report)
         : _directory(std::move(directory)), _report(std::move(report)) {}
 

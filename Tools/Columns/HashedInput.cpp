@@ -6,11 +6,8 @@
 #include "Platform/Linux/Errno.h"
 #include "Platform/Linux/Files/Files.h"
 #include "Recording/Files/FileSource.h"
-#include "Tools/Columns/TextHash.h"
+#include "Tools/Columns/ContentHash.h"
 
-#include <xxhash.h>
-
-#include <array>
 #include <cerrno>
 #include <cstdlib>
 #include <memory>
@@ -25,22 +22,6 @@ namespace velmora {
 namespace {
 
 constexpr std::size_t bufferSize = std::size_t{256} << 10;
-
-struct FreeState {
-    void operator()(XXH3_state_t* state) const { XXH3_freeState(state); }
-};
-
-std::string digitsOf(const XXH128_hash_t& hash) {
-    XXH128_canonical_t canonical;
-    XXH128_canonicalFromHash(&canonical, hash);
-    constexpr std::string_view digits = "0123456789abcdef";
-    std::string text;
-    for (const unsigned char byte : canonical.digest) {
-        text += digits[byte >> 4U];
-        text += digits[byte & 0xFU];
-    }
-    return text;
-}
 
 FileDescriptor temporaryFile() {
     const char* const directory = std::getenv("TMPDIR");
@@ -67,10 +48,6 @@ private:
 
 } // namespace
 
-std::string textHash(std::string_view text) {
-    return digitsOf(XXH3_128bits(text.data(), text.size()));
-}
-
 Result<HashedInput> HashedInput::open(const std::string& path) {
     FileDescriptor file(path == "-" ? ::dup(STDIN_FILENO) : ::open(path.c_str(), O_RDONLY | O_CLOEXEC));
     if (!file)
@@ -83,8 +60,7 @@ Result<HashedInput> HashedInput::open(const std::string& path) {
         if (!copy)
             return Failure{"cannot be kept for reading it twice: " + errnoText(errno)};
     }
-    const std::unique_ptr<XXH3_state_t, FreeState> state(XXH3_createState());
-    XXH3_128bits_reset(state.get());
+    ContentHash hash;
     std::vector<std::uint8_t> buffer(bufferSize);
     std::uint64_t size = 0;
     FileSource source(file.get(), false);
@@ -95,14 +71,13 @@ Result<HashedInput> HashedInput::open(const std::string& path) {
         if (*count == 0)
             break;
         const Bytes part = Bytes(buffer).first(*count);
-        XXH3_128bits_update(state.get(), part.data(), part.size());
+        hash.add(part);
         size += part.size();
         if (copy)
             if (const Result<Done> written = writeAll(copy.get(), part); !written)
                 return Failure{"cannot be kept for reading it twice: " + written.reason()};
     }
-    return HashedInput(copy ? std::move(copy) : std::move(file), digitsOf(XXH3_128bits_digest(state.get())),
-                       size);
+    return HashedInput(copy ? std::move(copy) : std::move(file), hash.digits(), size);
 }
 
 Result<std::unique_ptr<ByteSource>> HashedInput::read(InputError& error) const {
