@@ -38,6 +38,12 @@ bool isJoined(const std::filesystem::path& path) {
     return path.filename().string().starts_with(joinedPrefix);
 }
 
+/// A temporary name, which a process that was killed has left.
+bool isTemporary(const std::filesystem::path& path) {
+    const std::string name = path.filename().string();
+    return name.starts_with('.') && name.find(".parquet.") != std::string::npos;
+}
+
 /// A new name is on the disk before the old ones are removed from there.
 Result<Done> syncDirectory(const std::filesystem::path& path) {
     const FileDescriptor directory(::open(path.c_str(), O_RDONLY | O_DIRECTORY | O_CLOEXEC));
@@ -67,6 +73,10 @@ std::vector<Compaction::Part> Compaction::findParts() {
     std::set<std::string> joined;
     std::error_code error;
     for (const auto& file : std::filesystem::directory_iterator(_directory, error)) {
+        if (file.is_regular_file(error) && isTemporary(file.path())) {
+            std::filesystem::remove(file.path(), error);
+            continue;
+        }
         if (!file.is_regular_file(error) || file.path().extension() != ".parquet" ||
             file.path().filename().string().starts_with('.'))
             continue;

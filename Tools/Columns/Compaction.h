@@ -18,6 +18,7 @@ namespace velmora {
 
 /// Joins the small files of one directory, which are of one table, technology and day. A joined file gets its
 /// name before those that it is made of are removed; where that was interrupted, the next call removes them.
+/// So does it with the temporary files of processes that were killed.
 class Compaction {
 public:
     /// Files from that size on, in bytes, are left alone.

@@ -171,6 +171,15 @@ TEST_F(ColumnsCommandTest, removesThePartsOfAJoinedFileThatWereLeft) {
     EXPECT_EQ(files(), joined);
 }
 
+TEST_F(ColumnsCommandTest, removesWhatAKilledProcessLeft) {
+    writeDrive("a.pcapng");
+    static_cast<void>(columns({path("a.pcapng")}));
+    const auto before = files();
+    std::ofstream(path("out/messages/technology=Ostrel_GSM/date=2026-11-16/.f00.parquet.a1B2c3")) << "PAR1";
+    EXPECT_EQ(run({"columns", "--compact", path("out")}), "");
+    EXPECT_EQ(files(), before);
+}
+
 TEST_F(ColumnsCommandTest, leavesFilesOfOtherProgramsAlone) {
     writeDrive("a.pcapng");
     static_cast<void>(columns({path("a.pcapng")}));
