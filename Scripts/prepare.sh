@@ -66,6 +66,25 @@ run_apt() {
     }
 }
 
+# install_column_readers: the programs that the tests read columns with, from npm, into build/column-readers. Without them
+# that test is skipped, and says so.
+install_column_readers() {
+    local directory=build/column-readers
+    if ! command -v npm >/dev/null; then
+        say "There is no npm: the test that reads columns with programs of others is skipped"
+        return 0
+    fi
+    mkdir -p "$directory"
+    cmp -s Tests/Columns/Readers/package-lock.json "$directory/installed" && return 0
+    cp Tests/Columns/Readers/package.json Tests/Columns/Readers/package-lock.json "$directory"
+    say "Installing the programs that columns are read with"
+    if npm install --prefix "$directory" --ignore-scripts --no-audit --no-fund >"$directory/npm.log" 2>&1 </dev/null; then
+        cp Tests/Columns/Readers/package-lock.json "$directory/installed"
+    else
+        say "npm could not install them (see $directory/npm.log): the test that reads columns with them is skipped"
+    fi
+}
+
 # configure PRESET DIRECTORY OPTION...: configures unless that has been done; the options apply then only.
 configure() {
     local preset=$1 directory=$2

@@ -111,6 +111,7 @@ CommandLine parseCommandLine(int count, const char* const* arguments) {
     commands.add(app, addStats);
     commands.add(app, addDiff);
     commands.add(app, addMask);
+    commands.add(app, addColumns);
 
     try {
         app.parse(count, arguments);

@@ -5,6 +5,7 @@
 
 #include "Platform/Linux/ProgramLog.h"
 #include "Platform/SystemLog.h"
+#include "Tools/Columns/ColumnsOptions.h"
 #include "Tools/Convert/ConvertOptions.h"
 #include "Tools/Decode/DecodeOptions.h"
 #include "Tools/Diff/DiffOptions.h"

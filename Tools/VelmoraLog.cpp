@@ -6,6 +6,7 @@
 #include "Platform/Console.h"
 #include "Platform/Linux/Files/FileResources.h"
 #include "Platform/Linux/StandardDescriptors.h"
+#include "Tools/Columns/ColumnsCommand.h"
 #include "Tools/CommandLine.h"
 #include "Tools/Convert/ConvertCommand.h"
 #include "Tools/Decode/DecodeCommand.h"
@@ -66,6 +67,8 @@ int run(const CommandLine& line, DecoderLines& lines, Output& output) {
         return runRules(*rules, output);
     if (const auto* mask = std::get_if<MaskCommandOptions>(&line.command))
         return runMask(*mask, output);
+    if (const auto* columns = std::get_if<ColumnsOptions>(&line.command))
+        return runColumns(*columns, lines, output);
     return runConvert(std::get<ConvertOptions>(line.command));
 }
 

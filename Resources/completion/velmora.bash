@@ -112,7 +112,8 @@ _velmora_log() {
         case ${words[i]} in
         --log | --log-level | --format | --every | --select | --from | --to | --code | --technology | --jobs | \
             --max-age | --duration | --count | --timeout | --description | --role | --kind | --severity | --clock | \
-            --rules | --exec | --exec-timeout | --fail-on | --by)
+            --rules | --exec | --exec-timeout | --fail-on | --by | --out | \
+            --compact | --level | --key | --new-key | --known)
             ((++i))
             ;;
         -?*) ;;
@@ -186,6 +187,10 @@ _velmora_log() {
         _velmora_path
         return
         ;;
+    --out | --compact)
+        _filedir -d
+        return
+        ;;
     --max-age | --from | --to | --code | --jobs | --duration | --count | --timeout | --description | \
         --exec-timeout)
         return # nothing that could be guessed
@@ -199,7 +204,7 @@ _velmora_log() {
         if [[ $cur == -* ]]; then
             _velmora_offer "${options[@]}" --version
         else
-            _velmora_offer decode watch record convert info fields events rules stats diff mask
+            _velmora_offer decode watch record convert info fields events rules stats diff mask columns
         fi
         return
         ;;
@@ -214,6 +219,7 @@ _velmora_log() {
     stats) options+=(--format --safe --histogram --by --select --role --from --to --clock --technology) ;;
     diff) options+=(--format --display --select --role --clock --technology) ;;
     mask) options+=(--level --key --technology --keep-unknown --report --force --new-key --check --known) ;;
+    columns) options+=(--out --compact --technology) ;;
     esac
     if [[ $cur == -* ]]; then
         _velmora_offer "${options[@]}"
@@ -223,7 +229,7 @@ _velmora_log() {
     case $command:$files in
     rules:0) _velmora_offer check test ;;
     rules:*) _filedir toml ;;
-    decode:* | info:* | events:* | stats:* | record:0 | convert:[01] | diff:[01] | mask:[01])
+    decode:* | info:* | events:* | stats:* | columns:* | record:0 | convert:[01] | diff:[01] | mask:[01])
         _filedir '@(pcapng|velmora|dlf)'
         ;;
     esac

@@ -41,9 +41,10 @@ bool rename(const std::string& from, const std::filesystem::path& to, AtomicFile
 
 } // namespace
 
-Result<AtomicFile> AtomicFile::create(const std::filesystem::path& target, mode_t mode) {
+Result<AtomicFile> AtomicFile::create(const std::filesystem::path& target, mode_t mode,
+                                      const std::string& prefix) {
     // Once the file exists nothing here may throw until the object owns it: the file would be left over.
-    std::string path = target.string() + ".XXXXXX";
+    std::string path = target.parent_path() / (prefix + target.filename().string() + ".XXXXXX");
     AtomicFile file(target, {}, {});
     file._file = FileDescriptor(::mkostemp(path.data(), O_CLOEXEC));
     if (!file._file)

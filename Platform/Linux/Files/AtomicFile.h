@@ -20,8 +20,10 @@ class AtomicFile {
 public:
     enum class IfExists { Replace, Refuse };
 
-    /// `mode`: the permissions of a new file, less the process's umask; an existing file's are kept.
-    static Result<AtomicFile> create(const std::filesystem::path& target, mode_t mode);
+    /// `mode`: the permissions of a new file, less the process's umask; an existing file's are kept. The
+    /// temporary name is the target's with `prefix` before it and some letters after it.
+    static Result<AtomicFile> create(const std::filesystem::path& target, mode_t mode,
+                                     const std::string& prefix = {});
     ~AtomicFile() { discard(); }
     AtomicFile(AtomicFile&& other) noexcept;
     AtomicFile& operator=(AtomicFile&&) = delete;

@@ -3,6 +3,7 @@
 """The list of cases. A new command gets its line here."""
 
 from velmora_chaos.failing.case import Case
+from velmora_chaos.failing.columns_case import ColumnsCase
 from velmora_chaos.failing.convert_case import ConvertCase
 from velmora_chaos.failing.record_case import RecordCase
 from velmora_chaos.failing.save_case import SaveCase
@@ -29,6 +30,7 @@ def all_cases() -> list[Case]:
         Case("stats", ["stats", "--by", "cell", str(RECORDINGS / "lte.pcapng")]),
         Case("diff of moments", ["diff", str(RECORDINGS / "gsm.pcapng@+60"), str(RECORDINGS / "gsm.pcapng")]),
         Case("diff of statistics", ["diff", str(RECORDINGS / "c2k.pcapng"), str(RECORDINGS / "lte.pcapng")]),
+        ColumnsCase("lte.pcapng"),
         ConvertCase("gsm.pcapng", "drive.pcapng", had=False),
         ConvertCase("gsm.pcapng", "drive.pcapng", had=True),
         ConvertCase("c2k.pcapng", "drive.dlf", had=False),

@@ -1,0 +1,116 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
+#include "Export/Columns/TechnologyTables.h"
+
+#include "Export/Columns/ValidText.h"
+#include "LogMessages/RecordTime.h"
+
+namespace velmora {
+
+namespace {
+
+constexpr std::size_t sizeColumn = CommonColumns::count;
+constexpr std::size_t decodedColumn = sizeColumn + 1;
+
+TableLayout messageLayout(std::string_view technology) {
+    TableLayout layout = messageTable("messages", technology);
+    layout.add("size_byte", StoredType::Integer);
+    layout.add("decoded_flag", StoredType::Boolean);
+    return layout;
+}
+
+} // namespace
+
+TechnologyTables::TechnologyTables(const Catalogue& catalogue, const std::string& file,
+                                   CurrentMessage& message, TableOutputs& outputs, PageCompressor& compressor)
+    : _technology(catalogue.technology()), _layout(catalogue), _message(message) {
+    _layout.tables.push_back(messageLayout(_technology));
+    _layout.tables.push_back(OtherFields::layout(_technology));
+    for (const TableLayout& layout : _layout.tables)
+        _tables.emplace_back(layout, file, outputs.open(layout.name, _technology), compressor);
+    _others.emplace(_tables.back());
+    _messages = &_tables[_tables.size() - 2];
+}
+
+RowContext TechnologyTables::contextOf(const ObservedMessage& message) const {
+    RowContext context{_message.number, _message.arrival.time_since_epoch().count()};
+    context.code = message.code;
+    if (message.timestamp && isRecordTime(*message.timestamp))
+        if (const std::optional<Time> own = timeOfRecord(*message.timestamp))
+            context.modemTime = own->time_since_epoch().count();
+    return context;
+}
+
+void TechnologyTables::addMessage(const RowContext& context, bool isDecoded) {
+    _messages->addRow(context);
+    _messages->column(sizeColumn).setInteger(_messages->row(), static_cast<std::int64_t>(_message.size));
+    _messages->column(decodedColumn).setFlag(_messages->row(), isDecoded);
+    ++_summary.messages;
+    _summary.undecoded += isDecoded ? 0 : 1;
+    if (!_summary.first)
+        _summary.first = _message.arrival;
+    _summary.last = _message.arrival;
+}
+
+void TechnologyTables::addUndecoded() {
+    addMessage({_message.number, _message.arrival.time_since_epoch().count()}, false);
+}
+
+void TechnologyTables::observed(const ObservedMessage& message) {
+    if (_message.number == 0 || _message.isObserved)
+        return;
+    _message.isObserved = true;
+    const RowContext context = contextOf(message);
+    addMessage(context, true);
+    for (const Observation& observation : message.observations)
+        add(context, observation);
+}
+
+void TechnologyTables::add(const RowContext& context, const Observation& observation) {
+    const std::size_t leaf = observation.leaf->index;
+    const LeafColumn place = leaf < _layout.leaves.size() ? _layout.leaves[leaf] : LeafColumn();
+    const bool isAbsent = observation.kind == ObservedKind::Absent;
+    // Why a field without values has none is no value either.
+    if (place.table == LeafColumn::none && isAbsent && observation.leaf->kind == ObservedKind::Absent)
+        return;
+    if (place.table == LeafColumn::none || (!isAbsent && observation.kind != observation.leaf->kind)) {
+        _message.textBytes += _others->add(context, observation);
+        return;
+    }
+    TableWriter& table = _tables[place.table];
+    if (!table.isAt(context.message, observation.rows.data()) ||
+        table.column(place.column).hasRow(table.row())) {
+        if (table.layout().depth > 0)
+            table.addRow(context, observation.rows, observation.rowKey);
+        else
+            table.addRow(context);
+    }
+    set(table, place.column, observation);
+}
+
+void TechnologyTables::set(TableWriter& table, std::size_t column, const Observation& observation) {
+    const std::uint32_t row = table.row();
+    switch (observation.kind) {
+    case ObservedKind::Number: table.column(column).setNumber(row, observation.number); break;
+    case ObservedKind::Enumeration:
+        setText(table, column, _text.of(observation));
+        table.column(column + 1).setInteger(row, observation.raw);
+        break;
+    case ObservedKind::Text: setText(table, column, observation.words); break;
+    case ObservedKind::Flag: table.column(column).setFlag(row, observation.raw != 0); break;
+    case ObservedKind::Binary:
+        _message.textBytes += observation.bytes.size();
+        table.column(column).setText(
+            row, {reinterpret_cast<const char*>(observation.bytes.data()), observation.bytes.size()});
+        break;
+    case ObservedKind::Absent: break;
+    }
+}
+
+void TechnologyTables::setText(TableWriter& table, std::size_t column, std::string_view text) {
+    _message.textBytes += text.size();
+    table.column(column).setText(table.row(), validText(text, _storage));
+}
+
+} // namespace velmora
