@@ -1,10 +1,10 @@
 # SPDX-FileCopyrightText: 2026 Velmora contributors
 # SPDX-License-Identifier: MIT
 # thrift::thrift, the library of Thrift, in whose compact protocol the metadata of column files is, and whose Debian
-# package has no CMake configuration.
+# package has no CMake configuration. The static one where there is one: the package of the shared one depends on Qt 5.
 
 find_path(THRIFT_INCLUDE_DIR thrift/protocol/TCompactProtocol.h)
-find_library(THRIFT_LIBRARY thrift)
+find_library(THRIFT_LIBRARY NAMES libthrift.a thrift)
 mark_as_advanced(THRIFT_INCLUDE_DIR THRIFT_LIBRARY)
 
 include(FindPackageHandleStandardArgs)
