@@ -7,6 +7,13 @@
 #include <utility>
 
 namespace velmora {
+namespace {
+
+std::chrono::nanoseconds nanosecondsOf(double seconds) {
+    return std::chrono::nanoseconds(std::llround(seconds * 1e9));
+}
+
+} // namespace
 
 Time DriveScenario::startTime() {
     using namespace std::chrono;
@@ -65,21 +72,35 @@ void DriveScenario::addUnusualMessage() {
     const std::size_t number = _unusualCount++;
     const UnusualMessageParts material = unusualMessageParts(number);
     const auto offset = offsetOf(_now);
-    if (const auto message = unusualMessage(allUnusualMessages[number % allUnusualMessages.size()], material,
-                                            startTime() + offset))
-        _events.push_back({offset, *message});
+    const UnusualMessage kind = allUnusualMessages[number % allUnusualMessages.size()];
+    const auto message = unusualMessage(kind, material, startTime() + offset);
+    if (!message)
+        return;
+    _events.push_back({offset, *message});
+    if (_truth)
+        _truth->followUnusual(offset, kind, number);
+    if (_truth && kind == UnusualMessage::Prefixed)
+        _truth->follow(offset, material.good.code());
 }
 
 void DriveScenario::send(double at, const std::optional<RecordBuilder>& record) {
-    if (!record)
-        return;
-    const auto offset = offsetOf(at);
-    _events.push_back({offset, record->message(startTime() + offset)});
+    if (record) {
+        const auto offset = offsetOf(at);
+        _events.push_back({offset, record->message(startTime() + offset)});
+    }
+    if (_truth)
+        _truth->follow(record ? _lastOffset : nanosecondsOf(at),
+                       record ? std::optional(record->code()) : std::nullopt);
+}
+
+void DriveScenario::finishTruth() {
+    if (_truth)
+        _truth->finish();
 }
 
 std::chrono::nanoseconds DriveScenario::offsetOf(double at) {
     // A moment that two steps reckon in different ways may come out a nanosecond apart.
-    _lastOffset = std::max(_lastOffset, std::chrono::nanoseconds(std::llround(at * 1e9)));
+    _lastOffset = std::max(_lastOffset, nanosecondsOf(at));
     return _lastOffset;
 }
 

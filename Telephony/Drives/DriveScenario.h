@@ -7,12 +7,14 @@
 #include "Telephony/Drives/PeriodicReport.h"
 #include "Telephony/Drives/Scenario.h"
 #include "Telephony/Drives/ScenarioRandom.h"
+#include "Telephony/Drives/Truth/DriveTruth.h"
 #include "Telephony/Drives/UnusualMessages.h"
 
 #include <cmath>
 #include <cstddef>
 #include <cstdint>
 #include <deque>
+#include <memory>
 #include <span>
 
 namespace velmora {
@@ -31,6 +33,8 @@ public:
     DriveScenario& operator=(const DriveScenario&) = delete;
 
     [[nodiscard]] ScenarioEvent next() final;
+    void tellTruth(TruthSink& sink) final { _truth = makeTruth(sink); }
+    void finishTruth() final;
 
     /// When the drive begins by the records' time stamps.
     [[nodiscard]] static Time startTime();
@@ -64,6 +68,9 @@ protected:
     /// What is changed for the unusual message of that number, from 0 on: its kind is allUnusualMessages's
     /// element `number` modulo their count.
     [[nodiscard]] virtual UnusualMessageParts unusualMessageParts(std::size_t number) = 0;
+
+    /// What follows the technology's phone.
+    [[nodiscard]] virtual std::unique_ptr<DriveTruth> makeTruth(TruthSink& sink) const = 0;
 
     [[nodiscard]] ScenarioRandom& random() { return _random; }
     /// The remaining steps of the procedures.
@@ -102,6 +109,7 @@ private:
     std::size_t _unusualCount = 0; ///< number of unusual messages so far
     std::chrono::nanoseconds _lastOffset{0};
     std::deque<ScenarioEvent> _events;
+    std::unique_ptr<DriveTruth> _truth; ///< null where none wants it
 };
 
 template <class Context>

@@ -19,6 +19,10 @@ RecordBuilder::RecordBuilder(std::uint32_t extraCode, Bytes payload)
     std::copy_backward(payload.begin(), payload.end(), _bytes.end());
 }
 
+std::uint32_t RecordBuilder::code() const {
+    return (_type == LogMessage::extraType ? LogMessage::firstExtraCode : 0) + _code;
+}
+
 RecordBuilder& RecordBuilder::cutTo(std::size_t length) {
     _bytes.resize(std::clamp(length, LogMessage::headerLength, _bytes.size()));
     return *this;

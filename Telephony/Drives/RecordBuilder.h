@@ -35,6 +35,8 @@ public:
     RecordBuilder& cutTo(std::size_t length);
 
     [[nodiscard]] std::size_t size() const { return _bytes.size(); }
+    /// Its log code, 0xFF0000 added for the extra stream.
+    [[nodiscard]] std::uint32_t code() const;
 
     /// The message: the record with its header, of this time stamp.
     [[nodiscard]] Data message(Time moment) const;

@@ -4,6 +4,7 @@
 #pragma once
 
 #include "Platform/Bytes.h"
+#include "Telephony/Drives/Truth/TruthSink.h"
 
 #include <chrono>
 #include <string_view>
@@ -25,6 +26,12 @@ public:
     [[nodiscard]] virtual std::string_view technology() const = 0;
     /// The next message; offsets never go back.
     [[nodiscard]] virtual ScenarioEvent next() = 0;
+
+    /// What the drive's phone does is passed on from now on, which changes no message. To be called before
+    /// the first message; the sink must outlive the scenario.
+    virtual void tellTruth(TruthSink& sink) = 0;
+    /// The drive is over: passes on what still lasts, if the truth is wanted.
+    virtual void finishTruth() = 0;
 };
 
 } // namespace velmora

@@ -4,19 +4,24 @@
 #include "Recording/Pcapng/PcapngWriter.h"
 #include "Telephony/Drives/DriveScenario.h"
 #include "Telephony/Drives/ScenarioRegistry.h"
+#include "Tests/Recordings/TruthFile.h"
 
+#include <algorithm>
 #include <charconv>
 #include <chrono>
 #include <cstdint>
 #include <cstdio>
 #include <limits>
+#include <memory>
 #include <optional>
 #include <string>
 #include <string_view>
+#include <vector>
 
 // Writes the beginning of a scenario's drive as a recording, stamped with the drive's own time and without
-// waiting for it: so many messages, or with "h" so many hours. The same arguments make the same file; a FILE
-// of - is standard output, so that a long drive need not be stored.
+// waiting for it: so many messages, or with "h" or "s" so many hours or seconds. The same arguments make the
+// same file; a FILE of - is standard output, so that a long drive need not be stored. With --truth it also
+// writes what the drive's phone did, as JSON lines; the recording is the same with and without it.
 
 namespace velmora {
 namespace {
@@ -32,47 +37,78 @@ std::optional<std::uint64_t> numberOf(std::string_view text) {
 /// Where a drive ends, whichever comes first.
 struct Length {
     std::uint64_t messages = std::numeric_limits<std::uint64_t>::max();
-    std::chrono::hours time = std::chrono::hours(24 * 365 * 100);
+    std::chrono::seconds time = std::chrono::hours(24 * 365 * 100);
 };
 
 std::optional<Length> lengthOf(std::string_view text) {
-    const bool isHours = text.ends_with('h');
-    const std::optional<std::uint64_t> number = numberOf(text.substr(0, text.size() - (isHours ? 1 : 0)));
+    const std::uint64_t unit_s = text.ends_with('h') ? 3600 : text.ends_with('s') ? 1 : 0;
+    const std::optional<std::uint64_t> number = numberOf(text.substr(0, text.size() - (unit_s > 0 ? 1 : 0)));
     Length length;
-    if (!number || (isHours && *number > static_cast<std::uint64_t>(length.time.count())))
+    if (!number || (unit_s > 0 && *number > static_cast<std::uint64_t>(length.time.count()) / unit_s))
         return std::nullopt;
-    if (isHours)
-        length.time = std::chrono::hours(*number);
+    if (unit_s > 0)
+        length.time = std::chrono::seconds(*number * unit_s);
     else
         length.messages = *number;
     return length;
 }
 
-Result<Done> make(Scenario& scenario, const Length& length, const std::string& path) {
+/// Returns the offset of the last message.
+Result<TruthTime> make(Scenario& scenario, const Length& length, const std::string& path) {
     Result<std::unique_ptr<PcapngWriter>> writer = PcapngWriter::create(path, scenario.technology());
     if (!writer)
         return Failure{writer.reason()};
+    TruthTime last{0};
     for (std::uint64_t i = 0; i < length.messages; ++i) {
         const ScenarioEvent event = scenario.next();
         if (event.offset >= length.time)
             break;
         const Time time = DriveScenario::startTime() + event.offset;
-        if (Result<Done> written = (*writer)->append(time, event.message.bytes()); !written)
-            return written;
+        if (const Result<Done> written = (*writer)->append(time, event.message.bytes()); !written)
+            return Failure{written.reason()};
+        last = event.offset;
     }
-    return (*writer)->close();
+    if (const Result<Done> closed = (*writer)->close(); !closed)
+        return Failure{closed.reason()};
+    return last;
 }
 
-int run(int count, char** arguments) {
-    const ScenarioKind* kind = count == 5 ? scenarioKindNamed(arguments[1]) : nullptr;
-    const std::optional<std::uint64_t> seed = count == 5 ? numberOf(arguments[2]) : std::nullopt;
-    const std::optional<Length> length = count == 5 ? lengthOf(arguments[3]) : std::nullopt;
+/// The same, with the truth beside it.
+Result<TruthTime> makeWithTruth(Scenario& scenario, const Length& length, const std::string& path,
+                                const std::string& truthPath) {
+    TruthFile truth;
+    scenario.tellTruth(truth);
+    Result<TruthTime> last = make(scenario, length, path);
+    if (!last)
+        return last;
+    scenario.finishTruth();
+    if (const Result<Done> written = truth.write(truthPath, DriveScenario::startTime(), *last); !written)
+        return Failure{written.reason()};
+    return last;
+}
+
+int run(std::vector<std::string> arguments) {
+    std::optional<std::string> truth;
+    if (const auto option = std::find(arguments.begin(), arguments.end(), "--truth");
+        arguments.end() - option >= 2) {
+        truth = option[1];
+        arguments.erase(option, option + 2);
+    }
+    const bool isComplete = arguments.size() == 4;
+    const ScenarioKind* kind = isComplete ? scenarioKindNamed(arguments[0]) : nullptr;
+    const std::optional<std::uint64_t> seed = isComplete ? numberOf(arguments[1]) : std::nullopt;
+    const std::optional<Length> length = isComplete ? lengthOf(arguments[2]) : std::nullopt;
     if (!kind || !seed || !length) {
-        std::fprintf(stderr, "usage: make-drive SCENARIO SEED MESSAGES|HOURSh FILE\nscenarios: %s\n",
+        std::fprintf(stderr,
+                     "usage: make-drive SCENARIO SEED MESSAGES|HOURSh|SECONDSs FILE [--truth FILE]\n"
+                     "scenarios: %s\n",
                      scenarioNames().c_str());
         return 2;
     }
-    if (const Result<Done> made = make(*kind->make(*seed), *length, arguments[4]); !made) {
+    const std::unique_ptr<Scenario> scenario = kind->make(*seed);
+    const Result<TruthTime> made = truth ? makeWithTruth(*scenario, *length, arguments[3], *truth)
+                                         : make(*scenario, *length, arguments[3]);
+    if (!made) {
         std::fprintf(stderr, "make-drive: %s\n", made.reason().c_str());
         return 1;
     }
@@ -83,5 +119,5 @@ int run(int count, char** arguments) {
 } // namespace velmora
 
 int main(int count, char** arguments) {
-    return velmora::run(count, arguments);
+    return velmora::run({arguments + 1, arguments + count});
 }

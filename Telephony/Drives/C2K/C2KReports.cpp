@@ -133,6 +133,7 @@ Report oneXStatusReport(Context& context) {
     // Between two pages the receiver sleeps.
     if (phone.oneX == OneXState::Paging && !phone.onPacketData() && context.random.chance(0.4))
         report.state = OneXState::SlottedSleep;
+    context.receiver = report.state;
     if (phone.serving)
         report.serving = phone.serving->sector;
     report.received_dBm[0] = received(context);

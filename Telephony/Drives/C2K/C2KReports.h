@@ -37,6 +37,8 @@ struct C2KReportContext {
     records::ReversePackets reverse{};
     double forwardRest_bits = 0; ///< what has not filled a packet yet
     double reverseRest_bits = 0;
+    /// The 1x state as its latest report has it: the receiver sleeps between two pages.
+    records::OneXState receiver = records::OneXState::Inactive;
 
     /// The serving pilot and those of its carrier that are close enough to be in the active set.
     [[nodiscard]] std::vector<C2KPilot> activeSet(std::size_t limit) const;

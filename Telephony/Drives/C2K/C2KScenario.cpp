@@ -4,6 +4,7 @@
 #include "Telephony/Drives/C2K/C2KScenario.h"
 
 #include "Platform/TelephonyService.h"
+#include "Telephony/Drives/C2K/C2KTruth.h"
 
 namespace velmora {
 
@@ -150,6 +151,10 @@ void C2KScenario::addReports(DriveScript& due) {
 
 UnusualMessageParts C2KScenario::unusualMessageParts(std::size_t number) {
     return c2kUnusualMessageParts(_context, number / allUnusualMessages.size());
+}
+
+std::unique_ptr<DriveTruth> C2KScenario::makeTruth(TruthSink& sink) const {
+    return std::make_unique<C2KTruth>(_context, sink);
 }
 
 } // namespace velmora

@@ -54,6 +54,7 @@ private:
     void addReports(DriveScript& due) override;
     void countUntil(double at) override { _context.transferUntil(at); }
     [[nodiscard]] UnusualMessageParts unusualMessageParts(std::size_t number) override;
+    [[nodiscard]] std::unique_ptr<DriveTruth> makeTruth(TruthSink& sink) const override;
 
     void add1xStep(double delay, records::OneXState state);
     void addEVDOStep(double delay, records::EVDOState state);

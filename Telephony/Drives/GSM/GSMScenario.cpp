@@ -4,6 +4,7 @@
 #include "Telephony/Drives/GSM/GSMScenario.h"
 
 #include "Platform/TelephonyService.h"
+#include "Telephony/Drives/GSM/GSMTruth.h"
 #include "Telephony/Drives/ServingMeasurement.h"
 
 namespace velmora {
@@ -83,6 +84,10 @@ UnusualMessageParts GSMScenario::unusualMessageParts(std::size_t number) {
     if (allUnusualMessages[number % allUnusualMessages.size()] == UnusualMessage::UnknownCode)
         material.noise = random().between(0, 1 << 20);
     return material;
+}
+
+std::unique_ptr<DriveTruth> GSMScenario::makeTruth(TruthSink& sink) const {
+    return std::make_unique<GSMTruth>(_phone, sink);
 }
 
 } // namespace velmora

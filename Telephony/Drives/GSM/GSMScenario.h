@@ -53,6 +53,7 @@ private:
     void react() override;
     void addReports(DriveScript& due) override;
     [[nodiscard]] UnusualMessageParts unusualMessageParts(std::size_t number) override;
+    [[nodiscard]] std::unique_ptr<DriveTruth> makeTruth(TruthSink& sink) const override;
 
     RadioNetwork _network;
     GSMPhone _phone;

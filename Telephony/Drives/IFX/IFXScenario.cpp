@@ -5,6 +5,7 @@
 
 #include "Platform/TelephonyService.h"
 #include "PropertyLists/PropertyList.h"
+#include "Telephony/Drives/IFX/IFXTruth.h"
 #include "Telephony/Drives/ServingMeasurement.h"
 
 #include <algorithm>
@@ -59,7 +60,18 @@ ScenarioEvent IFXScenario::next() {
     followTimeline();
     camp();
     const int number = _seconds++;
+    if (_truth)
+        _truth->follow(std::chrono::seconds(number), std::nullopt);
     return {std::chrono::seconds(number), serialized(ifxDisplay(_phone, _network), number % 2 == 0)};
+}
+
+void IFXScenario::tellTruth(TruthSink& sink) {
+    _truth = std::make_unique<IFXTruth>(_phone, sink);
+}
+
+void IFXScenario::finishTruth() {
+    if (_truth)
+        _truth->finish();
 }
 
 void IFXScenario::followTimeline() {

@@ -5,8 +5,10 @@
 
 #include "Telephony/Drives/IFX/IFXDisplay.h"
 #include "Telephony/Drives/Scenario.h"
+#include "Telephony/Drives/Truth/DriveTruth.h"
 
 #include <cstddef>
+#include <memory>
 
 namespace velmora {
 
@@ -33,6 +35,8 @@ public:
 
     [[nodiscard]] std::string_view technology() const override;
     [[nodiscard]] ScenarioEvent next() override;
+    void tellTruth(TruthSink& sink) override;
+    void finishTruth() override;
 
     /// What the last message was of: the phone and the cells around it.
     [[nodiscard]] const IFXPhone& phone() const { return _phone; }
@@ -45,7 +49,8 @@ private:
     RadioNetwork _network;
     ScenarioRandom _random;
     IFXPhone _phone;
-    int _seconds = 0; ///< messages so far
+    std::unique_ptr<DriveTruth> _truth; ///< null where none wants it
+    int _seconds = 0;                   ///< messages so far
     std::size_t _phase = 0;
     int _phaseEnd = 0;
 };

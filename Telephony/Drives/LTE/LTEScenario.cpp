@@ -4,6 +4,7 @@
 #include "Telephony/Drives/LTE/LTEScenario.h"
 
 #include "Platform/TelephonyService.h"
+#include "Telephony/Drives/LTE/LTETruth.h"
 #include "Telephony/Drives/ServingMeasurement.h"
 
 #include <algorithm>
@@ -198,6 +199,10 @@ UnusualMessageParts LTEScenario::unusualMessageParts(std::size_t number) {
         break;
     }
     return {records::lteServingCell(serving.cell), tooShort, overrun, static_cast<std::int64_t>(number)};
+}
+
+std::unique_ptr<DriveTruth> LTEScenario::makeTruth(TruthSink& sink) const {
+    return std::make_unique<LTETruth>(_phone, sink);
 }
 
 } // namespace velmora

@@ -60,6 +60,7 @@ private:
     void react() override;
     void addReports(DriveScript& due) override;
     [[nodiscard]] UnusualMessageParts unusualMessageParts(std::size_t number) override;
+    [[nodiscard]] std::unique_ptr<DriveTruth> makeTruth(TruthSink& sink) const override;
 
     /// Camps on the best cell of the phone's carrier, where there is one, and reports it.
     std::optional<RecordBuilder> camp();

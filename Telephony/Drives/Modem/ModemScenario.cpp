@@ -6,6 +6,7 @@
 #include "Platform/TelephonyService.h"
 #include "Telephony/Drives/Modem/ModemCellReports.h"
 #include "Telephony/Drives/Modem/ModemReports.h"
+#include "Telephony/Drives/Modem/ModemTruth.h"
 
 #include <algorithm>
 
@@ -156,6 +157,10 @@ UnusualMessageParts ModemScenario::unusualMessageParts(std::size_t number) {
     cut.cutTo(cut.size() - 1);
     return {*modemReports::cells(context), cut, modemReports::unreasonableCells(_phone),
             static_cast<std::int64_t>(number)};
+}
+
+std::unique_ptr<DriveTruth> ModemScenario::makeTruth(TruthSink& sink) const {
+    return std::make_unique<ModemTruth>(_phone, sink);
 }
 
 } // namespace velmora

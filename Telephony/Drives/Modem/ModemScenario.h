@@ -65,6 +65,7 @@ private:
     void addReports(DriveScript& due) override;
     void countUntil(double at) override;
     [[nodiscard]] UnusualMessageParts unusualMessageParts(std::size_t number) override;
+    [[nodiscard]] std::unique_ptr<DriveTruth> makeTruth(TruthSink& sink) const override;
 
     /// Adds a change and the messages of all codes after it.
     void addChange(double delay, const std::function<void()>& change);

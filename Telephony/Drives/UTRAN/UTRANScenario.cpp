@@ -5,6 +5,7 @@
 
 #include "Platform/TelephonyService.h"
 #include "Telephony/Drives/ServingMeasurement.h"
+#include "Telephony/Drives/UTRAN/UTRANTruth.h"
 
 #include <algorithm>
 
@@ -185,6 +186,10 @@ UnusualMessageParts UTRANScenario::unusualMessageParts(std::size_t number) {
         break;
     }
     return {*utranReports::rrc(_context), tooShort, overrun, static_cast<std::int64_t>(number)};
+}
+
+std::unique_ptr<DriveTruth> UTRANScenario::makeTruth(TruthSink& sink) const {
+    return std::make_unique<UTRANTruth>(_phone, sink);
 }
 
 } // namespace velmora

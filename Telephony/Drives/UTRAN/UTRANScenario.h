@@ -53,6 +53,7 @@ private:
     void react() override;
     void addReports(DriveScript& due) override;
     [[nodiscard]] UnusualMessageParts unusualMessageParts(std::size_t number) override;
+    [[nodiscard]] std::unique_ptr<DriveTruth> makeTruth(TruthSink& sink) const override;
 
     void addRRCStep(double delay, records::RRCState state);
     void addContextsStep(double delay, int count);
