@@ -38,8 +38,10 @@ constexpr const char* connecting = "Connecting...";
 /// The model's observer: passes each refresh to the view, and keeps the status line up to date in between.
 class Watcher final : public ModelObserver {
 public:
-    Watcher(const WatchOptions& options, DecoderLines& lines, Output& output, ServiceClient& client)
-        : _client(client), _lines(lines), _options(options), _model(newModel()) {
+    /// `mask` may be null, for messages as they are.
+    Watcher(const WatchOptions& options, DecoderLines& lines, Output& output, ServiceClient& client,
+            MessageMask* mask)
+        : _client(client), _lines(lines), _options(options), _mask(mask), _model(newModel()) {
         if (!_options.once && Terminal::isThere())
             _view = std::make_unique<ScreenView>([this] { _client.loop.quit(ExitStatus::Done); });
         else
@@ -92,7 +94,7 @@ private:
             _view->showNote("the technology is " + std::string(shortTechnologyName(technology)) + " now", {});
             _client.queue.async([this] { beginAnew(); });
         };
-        return std::make_shared<WatchModel>(_client.platform(), this, _lines, std::move(events));
+        return std::make_shared<WatchModel>(_client.platform(), this, _lines, std::move(events), _mask);
     }
 
     /// Once for each change of it.
@@ -139,6 +141,7 @@ private:
     ServiceClient& _client;
     DecoderLines& _lines;
     const WatchOptions& _options;
+    MessageMask* _mask;
     bool _hasRefresh = false;
     std::shared_ptr<VelmoraModel> _model;
     std::unique_ptr<WatchView> _view;
@@ -152,9 +155,17 @@ private:
 } // namespace
 
 int runWatch(const WatchOptions& options, DecoderLines& lines, Output& output) {
+    const Result<std::optional<MaskOptions>> masking = maskOptionsOf(options.mask);
+    if (!masking) {
+        report(masking.reason());
+        return ExitStatus::BadInput;
+    }
+    std::optional<MessageMask> mask;
+    if (*masking)
+        mask.emplace(**masking);
     returnLargeAllocations();
     ServiceClient client;
-    const int status = Watcher(options, lines, output, client).run();
+    const int status = Watcher(options, lines, output, client, mask ? &*mask : nullptr).run();
     return output.state() == Output::State::Failed ? ExitStatus::BadInput : status;
 }
 

@@ -17,11 +17,15 @@ CLI::App* addWatch(CLI::App& app, WatchOptions& options) {
         ->needs(once)
         ->check(positiveSeconds())
         ->type_name("SECONDS");
+    addMaskOption(*command, options.mask);
     command->footer(
         "On a terminal the screen is redrawn in place: arrows, j, k, PgUp, PgDn, Home and End scroll,\n"
-        "q quits. On a pipe each refresh is printed, one after another.\n\n"
+        "q quits. On a pipe each refresh is printed, one after another.\n\n" +
+        std::string(maskHelp) +
+        "\n"
         "Examples:\n"
         "  velmora-log watch\n"
+        "  velmora-log watch --mask\n"
         "  velmora-log watch --once | grep -A20 'Serving Cell'");
     return command;
 }

@@ -3,6 +3,8 @@
 
 #pragma once
 
+#include "Tools/Mask/MaskOption.h"
+
 #include <optional>
 
 namespace CLI {
@@ -15,6 +17,7 @@ namespace velmora {
 struct WatchOptions {
     bool once = false;                     ///< print the first refresh and end
     std::optional<double> timeout_seconds; ///< with `once`: how long to wait for that
+    MaskOption mask;
 };
 
 /// Adds the command with its options, help and examples. Parsing fills `options`, which must outlive `app`.
