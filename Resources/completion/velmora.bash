@@ -35,9 +35,13 @@ _velmora() {
         _filedir -d
         return
         ;;
+    --mask-key)
+        _filedir
+        return
+        ;;
     esac
     $split && return
-    _velmora_offer -h --help --version --sysroot --log-directory --start-service --self-test --log --log-level
+    _velmora_offer -h --help --version --sysroot --log-directory --start-service --mask-key --self-test --log --log-level
 }
 
 # Completes a source: its kind, a scenario's name or a file, and then the options after commas.
@@ -106,7 +110,7 @@ _velmora_log() {
     for ((i = 1; i < cword; ++i)); do
         case ${words[i]} in
         --log | --log-level | --format | --every | --select | --from | --to | --code | --technology | --jobs | \
-            --max-age | --duration | --count | --timeout | --description | --role)
+            --max-age | --duration | --count | --timeout | --description | --role | --key)
             ((++i))
             ;;
         -?*) ;;
@@ -140,6 +144,18 @@ _velmora_log() {
         _velmora_offer "${_velmora_technologies[@]}" GSM CDMA LTE UTRAN
         return
         ;;
+    --mask)
+        # With the equals sign alone: without one a file follows.
+        if $split || [[ $cur == = ]]; then
+            cur=${cur#=}
+            _velmora_offer identity location all
+            return
+        fi
+        ;;
+    --key)
+        _filedir
+        return
+        ;;
     --select)
         _velmora_path
         return
@@ -160,8 +176,8 @@ _velmora_log() {
         fi
         return
         ;;
-    decode) options+=(--format --every --samples --wide --safe --max-age --select --from --to --code --warm --technology --strict --jobs) ;;
-    watch) options+=(--once --timeout) ;;
+    decode) options+=(--format --every --samples --wide --safe --max-age --select --from --to --code --warm --technology --mask --key --strict --jobs) ;;
+    watch) options+=(--once --timeout --mask --key) ;;
     record) options+=(--force --duration --count --timeout) ;;
     convert) options+=(--force --from --to --code --technology --description --strict) ;;
     info) options+=(--format --technology) ;;
