@@ -3,9 +3,25 @@
 
 #include "Export/Masking/MaskedReader.h"
 
+#include "LogMessages/LogMessage.h"
+#include "Platform/TelephonyService.h"
+
 #include <utility>
 
 namespace velmora {
+
+namespace {
+
+/// Whether the length field of a record leads to its end.
+bool isInChain(Bytes bytes, std::string_view technology) {
+    if (shortTechnologyName(technology) == shortTechnologyName(kVoxLogChannelTechnology_IFX))
+        return true;
+    const std::optional<LogMessage> message = LogMessage::parse(bytes);
+    return message && message->record.size() >= LogMessage::headerLength &&
+           message->record.size() - LogMessage::lengthOffset == message->length();
+}
+
+} // namespace
 
 std::optional<LoggedMessage> MaskedReader::next() {
     while (std::optional<LoggedMessage> message = _reader.next()) {
@@ -16,8 +32,14 @@ std::optional<LoggedMessage> MaskedReader::next() {
         if (_names[message->technology].empty())
             _names = _reader.technologies();
         const std::string& name = _override.empty() ? _names[message->technology] : _override;
-        if (std::optional<LoggedMessage> masked = _mask.mask(*std::move(message), name))
-            return masked;
+        std::optional<LoggedMessage> masked = _mask.mask(*std::move(message), name);
+        if (!masked)
+            continue;
+        if (_isForChain && !masked->refresh && !isInChain(masked->message.bytes(), name)) {
+            _mask.leaveOut();
+            continue;
+        }
+        return masked;
     }
     addLosses();
     return std::nullopt;

@@ -17,8 +17,9 @@ namespace velmora {
 class MaskedReader final : public MessageReader {
 public:
     /// Both must outlive it. `technology`, a short name, is that of all messages where it is not empty.
-    MaskedReader(MessageReader& reader, MessageMask& mask, std::string technology = {})
-        : _reader(reader), _mask(mask), _override(std::move(technology)) {}
+    /// `forChain`: messages whose end a reader of records without framing would not find are left out.
+    MaskedReader(MessageReader& reader, MessageMask& mask, std::string technology = {}, bool forChain = false)
+        : _reader(reader), _mask(mask), _override(std::move(technology)), _isForChain(forChain) {}
 
     [[nodiscard]] std::optional<LoggedMessage> next() override;
     [[nodiscard]] const std::string& technology() const override { return _reader.technology(); }
@@ -33,6 +34,7 @@ private:
     MessageReader& _reader;
     MessageMask& _mask;
     std::string _override;
+    bool _isForChain;
     std::vector<std::string> _names; ///< of the technologies so far
     std::size_t _losses = 0;         ///< so many of the reader's have been added
 };

@@ -8,11 +8,13 @@
 #include "LogMessages/LiveModem.h"
 #include "LogMessages/LogCodes.h"
 #include "LogMessages/LogMessage.h"
+#include "LogMessages/RecordTime.h"
 #include "Platform/Clock.h"
 #include "Platform/TelephonyService.h"
 #include "PropertyLists/PropertyList.h"
 
 #include <algorithm>
+#include <chrono>
 #include <limits>
 
 namespace velmora {
@@ -37,6 +39,17 @@ std::uint8_t setOf(std::string_view shortName) {
 bool isBinary(Bytes list) {
     constexpr std::string_view mark = "bplist";
     return list.size() >= mark.size() && std::equal(mark.begin(), mark.end(), list.begin());
+}
+
+/// Whether length and time stamp are such that nothing else can be there. The stamp is 0 or within two days
+/// of the arrival.
+bool isHeader(const LogMessage& message, Time arrival) {
+    constexpr std::chrono::hours near(48);
+    if (message.record.size() - LogMessage::lengthOffset != message.length())
+        return false;
+    const std::uint64_t stamp = message.timestamp().value_or(0);
+    const std::optional<Time> time = timeOfRecord(stamp);
+    return stamp == 0 || (time && *time > arrival - near && *time < arrival + near);
 }
 
 constexpr std::string_view emptyArray = "<array/>";
@@ -84,6 +97,7 @@ MessageMask::Technology* MessageMask::technologyOf(std::string_view name) {
 
 std::optional<LoggedMessage> MessageMask::mask(LoggedMessage message, std::string_view name) {
     ++_report.messages;
+    const Time arrival = message.time;
     if (_options.masksTimes()) {
         _shift.begin(message.time);
         message.time = _shift.shifted(message.time);
@@ -97,16 +111,16 @@ std::optional<LoggedMessage> MessageMask::mask(LoggedMessage message, std::strin
         return std::nullopt;
     }
     Buffer bytes(message.message.bytes().begin(), message.message.bytes().end());
-    if (maskBytes(bytes, *technology)) {
+    if (maskBytes(bytes, *technology, arrival)) {
         ++_report.changed;
         message.message = Data(std::move(bytes));
     }
     return message;
 }
 
-bool MessageMask::maskBytes(Buffer& bytes, Technology& technology) {
+bool MessageMask::maskBytes(Buffer& bytes, Technology& technology, Time arrival) {
     return technology.isDisplay ? maskPayload(bytes, 0, PropertyListKind::Display)
-                                : maskRecord(bytes, technology);
+                                : maskRecord(bytes, technology, arrival);
 }
 
 bool MessageMask::clear(Buffer& bytes, std::size_t from, Masked what) {
@@ -118,15 +132,21 @@ bool MessageMask::clear(Buffer& bytes, std::size_t from, Masked what) {
     return true;
 }
 
-bool MessageMask::maskRecord(Buffer& bytes, Technology& technology) {
+bool MessageMask::maskRecord(Buffer& bytes, Technology& technology, Time arrival) {
     const std::optional<LogMessage> message = LogMessage::parse(bytes);
     if (!message || message->record.size() < LogMessage::headerLength)
         return clear(bytes, 0, Masked::Malformed);
     const std::size_t start = message->prefixed ? LogMessage::prefixLength : 0;
     const std::uint32_t code = message->logCode();
     const bool isExtra = message->type == LogMessage::extraType;
-    if (!isExtra && message->type != LogMessage::basebandType && !technology.isCDMA)
-        return clear(bytes, start + 1, Masked::Malformed); // the type alone decides what decoders do
+    if (!isExtra && message->type != LogMessage::basebandType && !technology.isCDMA) {
+        // Where the rest of the header is one, files without framing need it to find the message's end.
+        if (!isHeader(*message, arrival))
+            return clear(bytes, start + 1, Masked::Malformed);
+        const bool isShifted =
+            _options.masksTimes() && shiftStamp(bytes, start + LogMessage::timestampOffset);
+        return clear(bytes, start + LogMessage::headerLength, Masked::Malformed) || isShifted;
+    }
     bool changed = _options.masksTimes() && shiftStamp(bytes, start + LogMessage::timestampOffset);
     const bool isWanted = (technologiesOfCode(code) & technology.set) != 0;
     if (isExtra && isWanted) {

@@ -34,6 +34,9 @@ public:
     /// that is not known.
     [[nodiscard]] std::optional<LoggedMessage> mask(LoggedMessage message, std::string_view technology);
 
+    /// Counts a message that the caller leaves out after all.
+    void leaveOut() { ++_report.leftOut; }
+
     [[nodiscard]] const MaskReport& report() const { return _report; }
     [[nodiscard]] const MaskOptions& options() const { return _options; }
 
@@ -42,8 +45,8 @@ private:
     using Buffer = std::vector<std::uint8_t>;
 
     [[nodiscard]] Technology* technologyOf(std::string_view name);
-    [[nodiscard]] bool maskBytes(Buffer& bytes, Technology& technology);
-    [[nodiscard]] bool maskRecord(Buffer& bytes, Technology& technology);
+    [[nodiscard]] bool maskBytes(Buffer& bytes, Technology& technology, Time arrival);
+    [[nodiscard]] bool maskRecord(Buffer& bytes, Technology& technology, Time arrival);
     [[nodiscard]] bool maskPayload(Buffer& bytes, std::size_t offset, PropertyListKind kind);
     [[nodiscard]] bool clear(Buffer& bytes, std::size_t from, Masked what);
     [[nodiscard]] bool shiftStamp(Buffer& bytes, std::size_t offset) const;

@@ -3,13 +3,17 @@
 
 #include "Export/Masking/SealedFile.h"
 
+#include "Export/Masking/MaskKey.h"
 #include "LogMessages/DLFVersionReport.h"
+#include "PropertyLists/PropertyList.h"
+#include "Recording/Files/GzipSource.h"
 #include "Recording/OpenMessages.h"
 #include "Recording/Pcapng/OptionReader.h"
 #include "Recording/Pcapng/Pcapng.h"
 #include "Recording/Pcapng/PcapngReader.h"
 
-#include <string>
+#include <algorithm>
+#include <memory>
 #include <utility>
 #include <vector>
 
@@ -17,10 +21,7 @@ namespace velmora {
 
 namespace {
 
-struct ReadFile {
-    std::optional<MaskSeal> seal; ///< as the file has it
-    std::string digest;           ///< empty after a loss
-};
+constexpr std::string_view descriptionKey = "Description";
 
 /// The comments of a recording that are about no message, of which there may be one section's alone: other
 /// tools join recordings so that a seal is followed by messages that it is not for.
@@ -50,45 +51,74 @@ private:
     std::optional<MaskSeal> _seal;
 };
 
-ReadFile readFile(ChunkedInput input) {
-    ReadFile result;
-    static_cast<void>(input.ensure(dlfVersionReportSize));
-    const Bytes begin = input.available();
-    if (begin.size() >= dlfVersionReportSize)
-        result.seal = MaskSeal::read(begin.subspan(MaskSeal::reportOffset, MaskSeal::reportLength));
-    const Result<std::unique_ptr<MessageReader>> opened = openMessages(std::move(input));
-    if (!opened)
-        return {};
-    MessageReader& reader = **opened;
-    std::optional<RecordingSeal> recording;
-    if (auto* const pcapng = dynamic_cast<PcapngReader*>(&reader))
-        recording.emplace(*pcapng);
-    reader.setReadsAllTechnologies(true);
+std::optional<MaskSeal> sealOfRecording(ChunkedInput input) {
+    const Result<std::unique_ptr<PcapngReader>> reader = PcapngReader::open(std::move(input));
+    if (!reader)
+        return std::nullopt;
+    const RecordingSeal recording(**reader);
+    (*reader)->setReadsAllTechnologies(true);
     MessageDigest digest;
-    while (const auto message = reader.next()) {
-        // Other files may be recognised by their messages, or not, and are of one technology anyway.
-        digest.add(recording ? reader.technologies()[message->technology] : std::string(),
-                   message->message.bytes());
-    }
-    if (recording)
-        result.seal = recording->seal();
-    else if (const std::vector<Comment>& comments = reader.comments().first(); !comments.empty())
-        result.seal = MaskSeal::read(comments.front().text);
-    if (reader.lossTotals().losses == 0 && !reader.failure())
-        result.digest = digest.text();
-    return result;
+    while (const auto message = (*reader)->next())
+        digest.add((*reader)->technologies()[message->technology], message->message.bytes());
+    const std::optional<MaskSeal> seal = recording.seal();
+    const bool isWhole = (*reader)->lossTotals().losses == 0 && !(*reader)->failure();
+    return seal && isWhole && seal->digest == digest.text() ? seal : std::nullopt;
+}
+
+std::optional<MaskSeal> sealOfSnapshot(ChunkedInput input) {
+    constexpr PropertyListLimits limits{.maximumObjects = 2'000'000, .maximumMemory = std::size_t{512} << 20};
+    if (input.ensure(limits.maximumBytes + 1))
+        return std::nullopt;
+    const Result<Value> root = readPropertyList(input.available(), limits);
+    const Dictionary* const snapshot = root ? root->asDictionary() : nullptr;
+    const std::string* const text = snapshot ? (*snapshot)[descriptionKey].asString() : nullptr;
+    const std::optional<MaskSeal> seal = text ? MaskSeal::read(*text) : std::nullopt;
+    if (!seal)
+        return std::nullopt;
+    const Result<std::string> digest = digestOfSnapshot(*root);
+    return digest && seal->digest == *digest ? seal : std::nullopt;
 }
 
 } // namespace
 
-std::optional<MaskSeal> readSeal(ChunkedInput input) {
-    const ReadFile file = readFile(std::move(input));
-    return file.seal && !file.digest.empty() && file.seal->digest == file.digest ? file.seal : std::nullopt;
+Result<std::string> digestOfSnapshot(const Value& root) {
+    Dictionary content;
+    for (const auto& [key, value] : *root.asDictionary())
+        if (key != descriptionKey)
+            content.set(key, value);
+    const Result<std::string> list =
+        writePropertyList(Value(std::make_shared<Dictionary>(std::move(content))));
+    if (!list)
+        return Failure{list.reason()};
+    Hash hash;
+    hash.add(Bytes(reinterpret_cast<const std::uint8_t*>(list->data()), list->size()));
+    return hexadecimalText(hash.digest());
 }
 
-std::optional<std::string> digestOfFile(ChunkedInput input) {
-    ReadFile file = readFile(std::move(input));
-    return file.digest.empty() ? std::nullopt : std::optional(std::move(file.digest));
+std::string digestOfLog(ChunkedInput input) {
+    Hash hash;
+    if (!input.ensure(dlfVersionReportSize))
+        return hexadecimalText(hash.digest());
+    input.skip(dlfVersionReportSize);
+    while (input.ensure(1)) {
+        hash.add(input.available());
+        input.skip(input.available().size());
+    }
+    return hexadecimalText(hash.digest());
+}
+
+std::optional<MaskSeal> readSeal(ChunkedInput input) {
+    static_cast<void>(input.ensure(dlfVersionReportSize));
+    if (isGzip(input.available()))
+        return readSeal(ChunkedInput(std::make_unique<GzipSource>(std::move(input))));
+    const Bytes begin = input.available();
+    if (begin.size() >= dlfVersionReportSize)
+        if (const auto seal = MaskSeal::read(begin.subspan(MaskSeal::reportOffset, MaskSeal::reportLength)))
+            return seal->digest == digestOfLog(std::move(input)) ? seal : std::nullopt;
+    constexpr std::string_view sectionHeader = "\n\r\r\n";
+    const bool isRecording = begin.size() >= sectionHeader.size() &&
+                             std::equal(sectionHeader.begin(), sectionHeader.end(), begin.begin());
+    return isRecording ? sealOfRecording(std::move(input)) : sealOfSnapshot(std::move(input));
 }
 
 } // namespace velmora

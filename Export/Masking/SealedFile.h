@@ -4,17 +4,22 @@
 #pragma once
 
 #include "Export/Masking/MaskSeal.h"
+#include "Platform/Result.h"
+#include "PropertyLists/Value.h"
 #include "Recording/Files/ChunkedInput.h"
 
 #include <optional>
+#include <string>
 
 namespace velmora {
 
-/// Reads a file of log messages to its end and returns its seal, if it has one and its messages are the ones
-/// that it was made for.
+/// The seal of a file of log messages, gzip'd or not, if it has one and the file is as it was when it got it.
+/// All of the file is read.
 [[nodiscard]] std::optional<MaskSeal> readSeal(ChunkedInput input);
 
-/// The same digest that `readSeal` compares; absent where the file cannot be read without a loss.
-[[nodiscard]] std::optional<std::string> digestOfFile(ChunkedInput input);
+/// The digest of a snapshot: of all but its description.
+[[nodiscard]] Result<std::string> digestOfSnapshot(const Value& root);
+/// The digest of a DLF log: of all after its version report.
+[[nodiscard]] std::string digestOfLog(ChunkedInput input);
 
 } // namespace velmora

@@ -112,19 +112,19 @@ Result<Done> searchFile(KnownValues& known, const std::string& path) {
 }
 
 Result<MaskReport> identitiesLeft(const MaskCommandOptions& options, bool& isWhole) {
-    Result<std::unique_ptr<ByteSource>> source = FileSource::open(options.checked);
+    Result<std::unique_ptr<ByteSource>> source = FileSource::open(options.file);
     const Result<MaskKey> key = MaskKey::random();
     if (!source || !key)
-        return Failure{source ? key.reason() : options.checked + ": " + source.reason()};
+        return Failure{source ? key.reason() : options.file + ": " + source.reason()};
     MaskOptions masking{*key, options.level};
     if (const auto seal = readSeal(ChunkedInput(*std::move(source)))) {
         masking.done = seal->level;
         // The times of a file have been moved, or have not.
         masking.level = std::max(options.level, std::min(seal->level, MaskLevel::Location));
     }
-    const Result<std::unique_ptr<MessageReader>> reader = openMessages(options.checked);
+    const Result<std::unique_ptr<MessageReader>> reader = openMessages(options.file);
     if (!reader)
-        return Failure{options.checked + ": " + reader.reason()};
+        return Failure{options.file + ": " + reader.reason()};
     MessageMask mask(masking);
     (*reader)->setReadsAllTechnologies(true);
     while (const auto message = (*reader)->next()) {
@@ -135,7 +135,8 @@ Result<MaskReport> identitiesLeft(const MaskCommandOptions& options, bool& isWho
     for (const Comment& comment : (*reader)->comments().first())
         if (!MaskSeal::read(comment.text))
             report.add(Masked::Comment);
-    isWhole = reportLosses(**reader, options.checked);
+    // What a sealed file's reader does not find is as it was masked nevertheless.
+    isWhole = reportLosses(**reader, options.file) || masking.done;
     return report;
 }
 
@@ -152,9 +153,9 @@ int runMaskCheck(const MaskCommandOptions& options, Output& output) {
         report(left.reason());
         return ExitStatus::BadInput;
     }
-    output.put(isClean(*left) ? options.checked + ": no identities of level " +
+    output.put(isClean(*left) ? options.file + ": no identities of level " +
                                     std::string(nameOf(options.level)) + " in clear\n"
-                              : leftText(options.checked, *left));
+                              : leftText(options.file, *left));
     bool isFound = false;
     if (!options.knownFile.empty()) {
         const Result<KnownLines> lines = readKnown(options.knownFile);
@@ -163,12 +164,12 @@ int runMaskCheck(const MaskCommandOptions& options, Output& output) {
             return ExitStatus::BadInput;
         }
         KnownValues known(lines->values);
-        if (const auto searched = searchFile(known, options.checked); !searched) {
+        if (const auto searched = searchFile(known, options.file); !searched) {
             report(searched.reason());
             return ExitStatus::BadInput;
         }
         for (const auto& [value, encoding] : known.findings())
-            output.put(options.checked + ": line " + std::to_string(lines->numbers[value]) + " of " +
+            output.put(options.file + ": line " + std::to_string(lines->numbers[value]) + " of " +
                        options.knownFile + " found: " + std::string(nameOf(encoding)) + "\n");
         isFound = !known.findings().empty();
     }

@@ -97,7 +97,7 @@ int maskFile(const MaskCommandOptions& options, Output& output) {
 } // namespace
 
 int runMask(const MaskCommandOptions& options, Output& output) {
-    if (!options.checked.empty())
+    if (options.checks)
         return runMaskCheck(options, output);
     if (options.newKey.empty())
         return maskFile(options, output);

@@ -53,26 +53,25 @@ CLI::App* addMask(CLI::App& app, MaskCommandOptions& options) {
             ->add_option("--new-key", options.newKey,
                          "Make a file with a random key, for its user alone, and do nothing else")
             ->type_name("FILE");
-    CLI::Option* check =
-        command
-            ->add_option("--check", options.checked,
-                         "Do not mask: report which identities FILE has, exit status 1 if any")
-            ->type_name("FILE");
+    CLI::Option* check = command->add_flag("--check", options.checks,
+                                           "Do not mask: report which identities FILE has in clear, exit "
+                                           "status 1 if any");
     CLI::Option* known =
         command
             ->add_option("--known", options.knownFile,
                          "With --check, look for these values too, one a line, in any encoding")
             ->type_name("FILE");
     known->needs(check);
-    for (CLI::Option* other : {file, out, key, keep, report, force}) {
+    for (CLI::Option* other : {out, key, keep, report, force}) {
         newKey->excludes(other);
         check->excludes(other);
     }
-    newKey->excludes(check);
-    command->callback([&options, command] {
-        if (options.newKey.empty() && options.checked.empty() && options.out.empty())
-            throw CLI::RequiredError(options.file.empty() ? "FILE" : "OUT");
-        static_cast<void>(command);
+    newKey->excludes(check)->excludes(file);
+    command->callback([&options] {
+        if (options.newKey.empty() && options.file.empty())
+            throw CLI::RequiredError("FILE");
+        if (options.newKey.empty() && !options.checks && options.out.empty())
+            throw CLI::RequiredError("OUT");
     });
     command->footer(
         "Masked are the numbers of subscriber, SIM and phone, phone numbers, addresses and temporary\n"

@@ -25,7 +25,7 @@ struct MaskCommandOptions {
     bool reports = false;
     bool force = false;
     std::string newKey;    ///< the file that is made; not empty: nothing else is done
-    std::string checked;   ///< the file that is checked; not empty: nothing else is done
+    bool checks = false;   ///< `file` is checked, and nothing else is done
     std::string knownFile; ///< values to look for, one a line; empty for none
 };
 

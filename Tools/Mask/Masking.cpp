@@ -61,22 +61,17 @@ Result<bool> toRecording(MessageReader& reader, const TechnologyChoice& choice, 
     return true;
 }
 
-/// The other forms have the seal where it can be written when the messages have been.
-Result<Done> sealFile(const AtomicFile& file, FileForm form, MaskSeal seal) {
+Result<Done> sealLog(const AtomicFile& file, MaskSeal seal) {
     Result<std::unique_ptr<ByteSource>> source = FileSource::open(file.path());
     if (!source)
         return Failure{source.reason()};
-    const std::optional<std::string> digest = digestOfFile(ChunkedInput(*std::move(source)));
-    if (!digest)
-        return Done{}; // as where a snapshot holds a message that no reader finds the end of
-    seal.digest = *digest;
-    if (form == FileForm::DLFLog) {
-        const std::vector<std::uint8_t> bytes = seal.bytes();
-        const ::ssize_t written =
-            ::pwrite(file.descriptor(), bytes.data(), bytes.size(), MaskSeal::reportOffset);
-        return written == static_cast<::ssize_t>(bytes.size()) ? Result<Done>(Done{})
-                                                               : Failure{errnoText(errno)};
-    }
+    seal.digest = digestOfLog(ChunkedInput(*std::move(source)));
+    const std::vector<std::uint8_t> bytes = seal.bytes();
+    const ::ssize_t written = ::pwrite(file.descriptor(), bytes.data(), bytes.size(), MaskSeal::reportOffset);
+    return written == static_cast<::ssize_t>(bytes.size()) ? Result<Done>(Done{}) : Failure{errnoText(errno)};
+}
+
+Result<Done> sealSnapshot(const AtomicFile& file, MaskSeal seal) {
     constexpr std::size_t largestSnapshot = std::size_t{256} << 20;
     const Result<Data> content = readFile(file.path(), largestSnapshot);
     if (!content)
@@ -85,6 +80,10 @@ Result<Done> sealFile(const AtomicFile& file, FileForm form, MaskSeal seal) {
         content->bytes(), {.maximumObjects = ~std::size_t{0}, .maximumMemory = ~std::size_t{0}});
     if (!root || !root->asDictionary())
         return Failure{root ? "no dictionary" : root.reason()};
+    Result<std::string> digest = digestOfSnapshot(*root);
+    if (!digest)
+        return Failure{digest.reason()};
+    seal.digest = *std::move(digest);
     root->asDictionary()->set("Description", seal.text());
     const Result<std::string> list = writePropertyList(*root);
     if (!list)
@@ -112,11 +111,14 @@ Result<bool> maskMessages(MessageReader& reader, const MaskCommandOptions& optio
         return Failure{title + ": " + choice.reason()};
     if (conversion.form == FileForm::Recording)
         return toRecording(reader, *choice, mask, title, options.out, file.descriptor());
-    MaskedReader masked(reader, mask, choice->override);
+    MaskedReader masked(reader, mask, choice->override, true);
     Result<bool> converted = convertMessages(masked, conversion, file.descriptor(), context);
     if (!converted)
         return converted;
-    if (const auto sealed = sealFile(file, conversion.form, sealOf(mask.options())); !sealed)
+    const MaskSeal seal = sealOf(mask.options());
+    if (const auto sealed =
+            conversion.form == FileForm::DLFLog ? sealLog(file, seal) : sealSnapshot(file, seal);
+        !sealed)
         return Failure{options.out + ": " + sealed.reason()};
     return converted;
 }

@@ -96,8 +96,11 @@ TEST_F(MessageMaskTest, UnknownCodeMayBeKept) {
 
 TEST_F(MessageMaskTest, MalformedMessagesBecomeZeros) {
     EXPECT_EQ(masked(hex("01 0F 00 35 71"), "Ostrel_GSM"), hex("00 00 00 00 00"));
-    EXPECT_EQ(masked(record(0x7135, "01 02", 2), "Ostrel_GSM"), hex("02 000000000000000000000000 0000"));
     EXPECT_EQ(_report.of(Masked::Malformed), 1U);
+    // Of an unknown type, with a header that is one apart from that, and without: its length is not 2.
+    EXPECT_EQ(masked(record(0x7135, "01 02", 2), "Ostrel_GSM"), record(0x7135, "00 00", 2));
+    EXPECT_EQ(masked(hex("02 0200 3571 0000000000000000 0102"), "Ostrel_GSM"),
+              hex("02 0000 0000 0000000000000000 0000"));
     // A record that ends within its time stamp.
     EXPECT_EQ(masked(hex("81 00 01 0A 00 35 71 01 02 03 04 05 06"), "Ostrel_GSM"),
               hex("00 00 00 00 00 00 00 00 00 00 00 00 00"));
