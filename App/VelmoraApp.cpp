@@ -3,6 +3,7 @@
 
 #include "App/VelmoraApp.h"
 
+#include "App/MaskingModel.h"
 #include "App/VelmoraPaneController.h"
 #include "App/VelmoraSaveViewController.h"
 #include "Model/NodePath.h"
@@ -24,6 +25,8 @@ constexpr const char* internalInstallMarker =
 constexpr const char* homeScreenDomain = "com.velmora.HomeScreen";
 constexpr const char* showGSMRSSIKey = "LantheShowGSMRSSI";
 constexpr const char* connecting = "Connecting...";
+constexpr char privacyKey = 'M';
+constexpr const char* maskedNotice = "Identities are masked. Ctrl-M shows them.";
 
 } // namespace
 
@@ -41,7 +44,8 @@ VelmoraApp::~VelmoraApp() {
 void VelmoraApp::applicationDidFinishLaunching(Application&) {
     getSaveButtonPref();
     _window = std::make_shared<Window>(Screen::mainBounds());
-    _model = std::make_shared<VelmoraModel>(_platform->model(), this);
+    _privacy = std::make_unique<PrivacySwitch>(_platform->preferences(), _maskKey);
+    _model = std::make_shared<MaskingModel>(_platform->model(), this, *_privacy);
     setUpdateMessage(connecting);
     _dateFormatter =
         std::make_unique<DateFormatter>(_platform->model().clock, "'Updated' yyyy-MM-dd 'at' HH:mm:ss");
@@ -50,6 +54,8 @@ void VelmoraApp::applicationDidFinishLaunching(Application&) {
     _navController = std::make_shared<NavigationController>(rootPane);
     _navController->setDelegate(this);
     _window->setRootViewController(_navController);
+    _window->setCommand(privacyKey, [this] { togglePrivacy(); });
+    updateNotice();
     _window->makeKeyAndVisible();
     // The screen is up before the first exchange with the telephony service, which blocks. The display's
     // server exposes a new window when it gets to it, which may be long after this task.
@@ -117,6 +123,29 @@ void VelmoraApp::startAnew() {
     terminate();
 }
 
+void VelmoraApp::togglePrivacy() {
+    if (!_model) // shut down
+        return;
+    _privacy->setOn(!_privacy->isOn());
+    // What was decoded so far is in the decoder, the tree, the panes and the save screen's copy.
+    _endsOnceSaved = false;
+    closeSaveView();
+    _model->forget();
+    clearPanes();
+    updateNotice();
+    _window->displayIfNeeded(); // the connection may block for seconds
+    _platform->model().queue.async([model = _model] { model->restartMonitor(); });
+}
+
+void VelmoraApp::clearPanes() {
+    const auto root =
+        std::static_pointer_cast<VelmoraPaneController>(_navController->viewControllers().front());
+    _navController->popToViewController(*root, false);
+    root->reloadWithNode(nullptr);
+    setUpdateMessage(connecting);
+    updateStatusForViewController(*root);
+}
+
 void VelmoraApp::updateStatusForViewController(VelmoraPaneController& pane) {
     if (_model->isConnected())
         pane.setStatus(updateMessage(), false);
@@ -157,15 +186,19 @@ void VelmoraApp::connectionChanged() {
 }
 
 void VelmoraApp::updateNotice() {
-    if (std::string problem = _notice.sentences(_model->problem()); !problem.empty()) {
-        _navController->setNotice({std::move(problem), {}, {}});
-        return;
-    }
+    Notice notice = connectionNotice();
+    if (_privacy->isOn())
+        notice.text = notice.text.empty() ? maskedNotice : maskedNotice + (" " + notice.text);
+    _navController->setNotice(std::move(notice));
+}
+
+Notice VelmoraApp::connectionNotice() {
+    if (std::string problem = _notice.sentences(_model->problem()); !problem.empty())
+        return {std::move(problem), {}, {}};
     std::string change = ConnectionNotice::ofTechnologies(*_model);
     if (change.empty())
-        _navController->setNotice({});
-    else
-        _navController->setNotice({std::move(change), "Start Anew", [this] { startAnew(); }});
+        return {};
+    return {std::move(change), "Start Anew", [this] { startAnew(); }};
 }
 
 void VelmoraApp::willShowViewController(NavigationController&, ViewController& viewController, bool) {

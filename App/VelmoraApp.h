@@ -6,14 +6,17 @@
 #include "App/AppPlatform.h"
 #include "App/ConnectionNotice.h"
 #include "App/DateFormatter.h"
+#include "App/PrivacySwitch.h"
 #include "Model/VelmoraModel.h"
 #include "Platform/Result.h"
 #include "Toolkit/Application.h"
 #include "Toolkit/ApplicationDelegate.h"
 #include "Toolkit/Navigation/NavigationControllerDelegate.h"
+#include "Toolkit/Notice.h"
 
 #include <functional>
 #include <memory>
+#include <optional>
 #include <string>
 #include <utility>
 
@@ -57,6 +60,12 @@ public:
     /// What is done before the first attempt to connect, once the window is on the screen; a failure is
     /// logged and shown. Set before the application runs.
     void setWillConnect(std::function<Result<Done>()> willConnect) { _willConnect = std::move(willConnect); }
+
+    /// The key of masked identities; a random one by default. Set before the application runs.
+    void setMaskKey(const MaskKey& key) { _maskKey = key; }
+    /// Masks identities, or shows them again: on the panes, on the save screen and in what that writes.
+    /// The panes begin empty, with a new connection, so that nothing decoded before is shown.
+    void togglePrivacy();
 
     /// The notice's button after a change of technology: ends the application, for its caller to start it
     /// anew. Where there is something to save and panes offer that, the save screen comes first: once a
@@ -107,15 +116,19 @@ private:
     };
 
     void connectFirst();
-    /// What the bar above the panes says: the connection's problem, or that the panes do not show what is
-    /// received.
+    void clearPanes();
+    /// What the bar above the panes says: that identities are masked, and the connection's problem or that
+    /// the panes do not show what is received.
     void updateNotice();
+    [[nodiscard]] Notice connectionNotice();
 
     std::unique_ptr<AppPlatform> _platform;
 
     std::shared_ptr<Window> _window;
     std::shared_ptr<NavigationController> _navController;
     std::shared_ptr<VelmoraSaveViewController> _saveViewController;
+    std::optional<MaskKey> _maskKey;
+    std::unique_ptr<PrivacySwitch> _privacy; ///< the model refers to it
     std::shared_ptr<VelmoraModel> _model;
     [[maybe_unused]] bool _allowSaveButton = false; ///< unused: the property has the flag
     std::unique_ptr<DateFormatter> _dateFormatter;

@@ -4,9 +4,11 @@
 #include "App/LinuxAppPlatform.h"
 #include "App/SelfTest.h"
 #include "App/VelmoraApp.h"
+#include "Export/Masking/MaskKey.h"
 #include "Platform/Linux/Files/FileResources.h"
 #include "Platform/Linux/Files/LargeAllocations.h"
 #include "Platform/Linux/Files/LinuxFileSystem.h"
+#include "Platform/Linux/Files/PrivateFile.h"
 #include "Platform/Linux/ProcessRestart.h"
 #include "Platform/Linux/ProgramLog.h"
 #include "Platform/Linux/ServiceStarter.h"
@@ -24,6 +26,7 @@
 #include <optional>
 #include <sstream>
 #include <string>
+#include <string_view>
 
 namespace {
 
@@ -41,7 +44,19 @@ struct Options {
     int logLevel = LogPriority::Error;
     bool isSelfTest = false;
     bool startsService = false;
+    std::optional<MaskKey> maskKey;
 };
+
+Result<MaskKey> readMaskKey(const std::string& path) {
+    constexpr std::size_t longestFile = 4096;
+    const Result<Data> content = readPrivateFile(path, longestFile);
+    if (!content)
+        return Failure{content.reason()};
+    const Bytes bytes = content->bytes();
+    Result<MaskKey> key =
+        MaskKey::read(std::string_view(reinterpret_cast<const char*>(bytes.data()), bytes.size()));
+    return key ? key : Failure{path + ": " + key.reason()};
+}
 
 void declare(CLI::App& app, Options& options) {
     app.description("Shows live what the cellular modem reports about the radio network.");
@@ -53,6 +68,17 @@ void declare(CLI::App& app, Options& options) {
                    "Where snapshots go (default $XDG_STATE_HOME/velmora)")
         ->envname("VELMORA_LOG_DIRECTORY")
         ->type_name("DIR");
+    app.add_option_function<std::string>(
+           "--mask-key",
+           [&options](const std::string& path) {
+               const Result<MaskKey> key = readMaskKey(path);
+               if (!key)
+                   throw CLI::ValidationError("--mask-key", key.reason());
+               options.maskKey = *key;
+           },
+           "The key of masked identities, which velmora-log mask --new-key makes (default a random one)")
+        ->envname("VELMORA_MASK_KEY")
+        ->type_name("FILE");
     app.add_option_function<std::string>(
            "--log", [&options](const std::string& name) { options.log = *logKindNamed(name); },
            "Where log lines go: syslog or stderr")
@@ -85,6 +111,8 @@ std::optional<int> show(const Options& options, char* program) {
                    [&options] { return std::make_unique<LinuxAppPlatform>(options.files); });
     if (options.startsService)
         app.setWillConnect([] { return startTelephonyService(); });
+    if (options.maskKey)
+        app.setMaskKey(*options.maskKey);
     std::unique_ptr<SelfTest> selfTest;
     if (options.isSelfTest)
         selfTest = std::make_unique<SelfTest>(app, selfTestLimit);

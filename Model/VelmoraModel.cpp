@@ -136,6 +136,16 @@ void VelmoraModel::destroyPorts() {
     }
 }
 
+void VelmoraModel::forget() {
+    destroyPorts();
+    _logGenerator.reset();
+    _state = Dictionary();
+    _technologies = DisplayTechnology();
+    _nodes.reset();
+    _nodesByPath.reset();
+    _updated = false;
+}
+
 void VelmoraModel::configureGenerator() {
     const std::optional<Value> technology = askTechnology(*_sendPort);
     if (!technology) {

@@ -84,6 +84,10 @@ public:
     void startMonitor();
     void restartMonitor();
 
+    /// Closes the ports and forgets all that was decoded: decoder, state and tree. `restartMonitor` begins
+    /// as if there had been no connection.
+    void forget();
+
     /// Passes one log message to the decoder.
     virtual void updateWithData(const Data& data);
 
@@ -131,8 +135,8 @@ private:
     bool _reportedConnected = false;
     ConnectionProblem _reportedProblem;
     DisplayTechnology _technologies;
-    /// Created once and never replaced: it survives reconnection and a change of decoder, so that a new
-    /// decoder starts with what the earlier one left in it. That is intended.
+    /// Created once and emptied by `forget` alone: it survives reconnection and a change of decoder, so that
+    /// a new decoder starts with what the earlier one left in it. That is intended.
     Dictionary _state;
     /// The cached tree and its paths: set together, dropped together.
     NodeRef _nodes;

@@ -26,10 +26,13 @@ struct PropertyListLimits {
     /// Whether the log gets an error line with the reason where one of the limits is exceeded: for receivers
     /// that only know good and malformed messages.
     bool logsExcess = false;
+    /// Whether a reason may quote texts and names of the input.
+    bool quotesInput = true;
 };
 
-/// The limits of log messages, whose decoders do not log reasons themselves.
-inline constexpr PropertyListLimits messageLimits{.logsExcess = true};
+/// The limits of log messages, whose decoders do not log reasons themselves. What is quoted from them could
+/// be a number of the subscriber, and reasons get into logs.
+inline constexpr PropertyListLimits messageLimits{.logsExcess = true, .quotesInput = false};
 
 /// Reads a property list of either form: binary where the input begins "bplist", XML otherwise.
 ///

@@ -10,6 +10,7 @@
 #include <pugixml.hpp>
 
 #include <algorithm>
+#include <iterator>
 #include <optional>
 #include <string>
 #include <string_view>
@@ -19,16 +20,8 @@ namespace velmora {
 
 namespace {
 
-/// Text as messages show it.
-std::string quoted(std::string_view text) {
-    constexpr std::size_t longest = 40;
-    if (text.size() <= longest)
-        return "\"" + std::string(text) + "\"";
-    std::size_t end = longest;
-    while (end > 0 && (static_cast<unsigned char>(text[end]) & 0xC0) == 0x80)
-        --end;
-    return "\"" + std::string(text.substr(0, end)) + "...\"";
-}
+constexpr std::string_view elementNames[] = {"plist", "dict", "array", "key",  "string", "integer",
+                                             "real",  "date", "data",  "true", "false"};
 
 bool isSpace(std::string_view text) {
     return std::all_of(text.begin(), text.end(), isXMLSpace);
@@ -58,6 +51,8 @@ private:
     bool failAt(pugi::xml_node node, const std::string& reason) {
         return failAt(_document.offsetOf(node), reason);
     }
+    [[nodiscard]] std::string quoted(std::string_view text) const;
+    [[nodiscard]] std::string tag(std::string_view name) const;
     bool isAllowed(std::optional<Failure> excess) { return !excess || fail(std::move(excess->reason)); }
 
     bool readDocument(Value& value);
@@ -76,6 +71,26 @@ private:
     ReadingBudget _budget;
     std::string _reason;
 };
+
+/// Text as reasons show it.
+std::string Reader::quoted(std::string_view text) const {
+    if (!_limits.quotesInput)
+        return "of " + std::to_string(text.size()) + (text.size() == 1 ? " byte" : " bytes");
+    constexpr std::size_t longest = 40;
+    if (text.size() <= longest)
+        return "\"" + std::string(text) + "\"";
+    std::size_t end = longest;
+    while (end > 0 && (static_cast<unsigned char>(text[end]) & 0xC0) == 0x80)
+        --end;
+    return "\"" + std::string(text.substr(0, end)) + "...\"";
+}
+
+/// A name as reasons show it.
+std::string Reader::tag(std::string_view name) const {
+    const bool isShown =
+        _limits.quotesInput || std::ranges::find(elementNames, name) != std::end(elementNames);
+    return "<" + (isShown ? std::string(name) : "...") + ">";
+}
 
 /// The next element after `element`, or the first one where that is null; null at the end. Only white space
 /// may be between elements.
@@ -108,7 +123,7 @@ bool Reader::readDocument(Value& value) {
         std::string_view(root.name()) == "plist" ? readPlist(root, value) : readValue(root, 1, value);
     if (!good || !nextElement(_document.root(), root))
         return false;
-    return !root || failAt(root, "a second root element <" + std::string(root.name()) + ">");
+    return !root || failAt(root, "a second root element " + tag(root.name()));
 }
 
 bool Reader::readPlist(pugi::xml_node plist, Value& value) {
@@ -163,7 +178,7 @@ bool Reader::readDictionary(pugi::xml_node element, std::size_t depth, Value& va
             return true;
         }
         if (std::string_view(child.name()) != "key")
-            return failAt(child, "<" + std::string(child.name()) + "> where a <key> was wanted");
+            return failAt(child, tag(child.name()) + " where a <key> was wanted");
         const pugi::xml_node keyElement = child;
         if (!isAllowed(_budget.takeObject()) || !readText(keyElement, key) ||
             !isAllowed(_budget.takeBytes(2 * key.size())) || !nextElement(element, child))
@@ -185,14 +200,14 @@ bool Reader::readScalar(pugi::xml_node element, std::string_view name, Value& va
     const bool isReal = name == "real";
     const bool isDate = name == "date";
     if (!isString && !isTrue && !isInteger && !isReal && !isDate && name != "false" && name != "data")
-        return failAt(element, "<" + std::string(name) + "> where a value was wanted");
+        return failAt(element, tag(name) + " where a value was wanted");
 
     std::string text;
     if (!readText(element, text))
         return false;
     const auto wanted = [&](std::string_view what) {
-        return failAt(element,
-                      "<" + std::string(name) + "> holds " + quoted(text) + ", not " + std::string(what));
+        return failAt(element, tag(name) + " holds " + (_limits.quotesInput ? "" : "text ") + quoted(text) +
+                                   ", not " + std::string(what));
     };
     if (isString) {
         if (!isAllowed(_budget.takeBytes(text.size())))
@@ -237,7 +252,7 @@ bool Reader::readText(pugi::xml_node element, std::string& text) {
         return false;
     for (const pugi::xml_node piece : element.children()) {
         if (piece.type() == pugi::node_element)
-            return failAt(piece, "<" + std::string(piece.name()) + "> inside <" + element.name() + ">");
+            return failAt(piece, tag(piece.name()) + " inside " + tag(element.name()));
         if (piece.type() == pugi::node_cdata)
             text += piece.value();
         else if (!appendUnescaped(piece.value(), _document.offsetOf(piece), text))

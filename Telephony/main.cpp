@@ -95,7 +95,7 @@ int serve(const Options& options, const velmora::SourceChoice& choice) {
         complain(listening.reason());
         return badInput;
     }
-    const std::string serving = std::string("serving ").append(options.source);
+    const std::string serving = "serving " + loggedSource(options.source, choice);
     logLine(LogPriority::Notice, serving);
     manager.ready(serving);
     const int status = loop.run();

@@ -84,6 +84,7 @@ Window::~Window() {
     window.onSave = nullptr;
     window.onFocus = nullptr;
     window.onPainted = nullptr;
+    window.commands.clear();
     window.hide();
     if (_impl->root)
         _impl->root->view().removeFromSuperview();
@@ -133,6 +134,10 @@ void Window::displayIfNeeded() {
     // New texts are laid out first.
     QCoreApplication::sendPostedEvents(nullptr, QEvent::LayoutRequest);
     _impl->widget().repaint();
+}
+
+void Window::setCommand(char letter, std::function<void()> command) {
+    _impl->widget().commands[letter] = std::move(command); // the number of a letter's key is its code
 }
 
 bool Window::isHidden() const {

@@ -36,6 +36,9 @@ public:
     void whenPainted(std::function<void()> painted);
     /// Draws what has changed now, for a caller that blocks the event loop next.
     void displayIfNeeded();
+    /// Calls `command` when Ctrl and the capital letter are pressed, on whatever screen, a modal one
+    /// included.
+    void setCommand(char letter, std::function<void()> command);
     [[nodiscard]] bool isHidden() const;
     /// Takes the window off the screen, or puts it back.
     void setHidden(bool isHidden);

@@ -5,6 +5,11 @@
 
 #include "Export/Masking/KeyedHash.h"
 
+#include <cerrno>
+#include <system_error>
+
+#include <sys/random.h>
+
 namespace velmora {
 
 namespace {
@@ -26,6 +31,13 @@ std::string hexadecimalText(Bytes bytes) {
     for (const std::uint8_t byte : bytes)
         text.append({hexadecimalDigits[byte >> 4], hexadecimalDigits[byte & 0xF]});
     return text;
+}
+
+Result<MaskKey> MaskKey::random() {
+    MaskKey key;
+    if (::getentropy(key.bytes.data(), key.bytes.size()) != 0)
+        return Failure{"cannot make a key: " + std::generic_category().message(errno)};
+    return key;
 }
 
 Result<MaskKey> MaskKey::read(std::string_view text) {

@@ -19,6 +19,8 @@ struct MaskKey {
     static constexpr std::size_t length = 32;
     std::array<std::uint8_t, length> bytes{};
 
+    /// From the system's random numbers.
+    static Result<MaskKey> random();
     /// As a key file holds it: 64 hexadecimal digits, and white space after them.
     static Result<MaskKey> read(std::string_view text);
     [[nodiscard]] std::string text() const;

@@ -21,6 +21,7 @@ namespace {
 constexpr PropertyListLimits snapshotLimits{
     .maximumObjects = 11 * messageLimits.maximumObjects,
     .maximumMemory = std::size_t{512} << 20,
+    .quotesInput = messageLimits.quotesInput,
 };
 
 /// How far apart the application's refreshes are.

@@ -40,9 +40,13 @@ _velmora() {
         _filedir -d
         return
         ;;
+    --mask-key)
+        _filedir
+        return
+        ;;
     esac
     $split && return
-    _velmora_offer -h --help --version --sysroot --log-directory --start-service --self-test --log --log-level
+    _velmora_offer -h --help --version --sysroot --log-directory --start-service --mask-key --self-test --log --log-level
 }
 
 # Completes a source: its kind, a scenario's name or a file, and then the options after commas.
@@ -179,6 +183,14 @@ _velmora_log() {
         _velmora_offer identity location all
         return
         ;;
+    --mask)
+        # With the equals sign alone: without one a file follows.
+        if $split || [[ $cur == = ]]; then
+            cur=${cur#=}
+            _velmora_offer identity location all
+            return
+        fi
+        ;;
     --key | --new-key | --known)
         _filedir
         return
@@ -208,8 +220,8 @@ _velmora_log() {
         fi
         return
         ;;
-    decode) options+=(--format --every --samples --wide --safe --max-age --select --from --to --code --warm --technology --strict --jobs) ;;
-    watch) options+=(--once --timeout --bell) ;;
+    decode) options+=(--format --every --samples --wide --safe --max-age --select --from --to --code --warm --technology --mask --key --strict --jobs) ;;
+    watch) options+=(--once --timeout --bell --mask --key) ;;
     record) options+=(--force --duration --count --timeout) ;;
     convert) options+=(--force --from --to --code --technology --description --strict) ;;
     info) options+=(--format --technology) ;;

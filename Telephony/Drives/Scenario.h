@@ -4,6 +4,7 @@
 #pragma once
 
 #include "Platform/Bytes.h"
+#include "Telephony/Drives/DriveIdentities.h"
 #include "Telephony/Drives/Truth/TruthSink.h"
 
 #include <chrono>
@@ -26,6 +27,10 @@ public:
     [[nodiscard]] virtual std::string_view technology() const = 0;
     /// The next message; offsets never go back.
     [[nodiscard]] virtual ScenarioEvent next() = 0;
+
+    /// The drive becomes that of this subscriber; the default is one of a test network. To be called before
+    /// the first message.
+    virtual void setIdentities(const DriveIdentities& identities) = 0;
 
     /// What the drive's phone does is passed on from now on, which changes no message. To be called before
     /// the first message; the sink must outlive the scenario.

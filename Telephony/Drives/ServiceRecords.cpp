@@ -101,11 +101,11 @@ DictionaryRef lteCellInformation(const LTEMeasurement& cell, bool serving) {
     return each;
 }
 
-DictionaryRef testSIM(const CellArea& lastArea) {
+DictionaryRef testSIM(const CellArea& lastArea, const DriveIdentities& identities) {
     return std::make_shared<Dictionary>(Dictionary{
-        {"kSimFile_ICCID", "8900101000000000017"},
-        {"kSimFile_MSISDN", "+1 555 0100"},
-        {"kSimFile_MBDN", "+1 555 0199"},
+        {"kSimFile_ICCID", identities.sims[0].iccid},
+        {"kSimFile_MSISDN", identities.sims[0].number},
+        {"kSimFile_MBDN", identities.mailbox},
         {"kSimFile_HPPLMN", "60 min"},
         {"kSimFile_LOCI", "001-01, LAC " + std::to_string(lastArea.lac) + ", updated"},
         {"kSimFile_PSLOCI", "001-01, LAC " + std::to_string(lastArea.lac) + ", RAC " +
@@ -121,15 +121,16 @@ DictionaryRef testSIM(const CellArea& lastArea) {
     });
 }
 
-DictionaryRef testContext(int number) {
+DictionaryRef testContext(int number, const DriveIdentities& identities) {
     const bool internet = number == 1;
+    const std::string& addresses = internet ? identities.addresses : identities.addresses6;
     return std::make_shared<Dictionary>(Dictionary{
         {"Context ID", std::to_string(number)},
         {"NSAPI", std::to_string(4 + number)},
         {"APN", internet ? "internet.test" : "mms.test"},
         {"PDP Type", internet ? "IPv4" : "IPv6"},
-        {"PDP Address", internet ? "192.0.2.17" : "2001:db8::17"},
-        {"Primary DNS", internet ? "192.0.2.1" : "2001:db8::1"},
+        {"PDP Address", addresses + "17"},
+        {"Primary DNS", addresses + "1"},
         {"QoS Traffic Class", internet ? "Interactive" : "Background"},
         {"Maximum Bit Rate Uplink", "384 kbit/s"},
         {"Maximum Bit Rate Downlink", "7168 kbit/s"},

@@ -4,6 +4,7 @@
 #pragma once
 
 #include "PropertyLists/Value.h"
+#include "Telephony/Drives/DriveIdentities.h"
 #include "Telephony/Drives/LTE/LTENetwork.h"
 #include "Telephony/Drives/RadioNetwork.h"
 #include "Telephony/Drives/RecordBuilder.h"
@@ -29,9 +30,9 @@ namespace velmora::records {
 [[nodiscard]] DictionaryRef utranCellInformation(const UTRANMeasurement& cell, bool serving);
 [[nodiscard]] DictionaryRef lteCellInformation(const LTEMeasurement& cell, bool serving);
 
-/// The files of a test SIM of network 001/01 that was last in this area.
-[[nodiscard]] DictionaryRef testSIM(const CellArea& lastArea);
+/// The files of the first SIM, of network 001/01, that was last in this area.
+[[nodiscard]] DictionaryRef testSIM(const CellArea& lastArea, const DriveIdentities& identities);
 /// A context of the test network; `number` counts from 1.
-[[nodiscard]] DictionaryRef testContext(int number);
+[[nodiscard]] DictionaryRef testContext(int number, const DriveIdentities& identities);
 
 } // namespace velmora::records

@@ -160,4 +160,18 @@ Result<SourceChoice> parseSource(std::string_view text) {
     return Failure{"source is " + quoted(text) + ", wanted " + std::string(sourceForms)};
 }
 
+std::string loggedSource(std::string_view text, const SourceChoice& choice) {
+    const auto* const modem = std::get_if<ModemManagerChoice>(&choice);
+    if (!modem)
+        return std::string(text);
+    ModemChoice chosen;
+    static_cast<void>(chosen.setModem(modem->modem));
+    std::string logged = "modemmanager";
+    if (!modem->modem.empty())
+        logged.append(",").append(modemKey).append(chosen.equipment.empty() ? modem->modem : "...");
+    if (!modem->sim.empty())
+        logged.append(",").append(simKey).append(modem->sim.starts_with('/') ? modem->sim : "...");
+    return logged;
+}
+
 } // namespace velmora

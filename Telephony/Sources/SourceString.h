@@ -45,4 +45,8 @@ inline constexpr std::string_view sourceForms =
 /// The reason names the found and the expected value.
 Result<SourceChoice> parseSource(std::string_view text);
 
+/// A source that has been parsed, as log lines name it: without the identity of the equipment or SIM that
+/// chooses a modem.
+[[nodiscard]] std::string loggedSource(std::string_view text, const SourceChoice& choice);
+
 } // namespace velmora

@@ -48,6 +48,28 @@ TEST_F(VelmoraModelRunTest, RedrawIsQueuedNeverRunWithinTheTick) {
     EXPECT_EQ(redraws, 1);
 }
 
+TEST_F(VelmoraModelRunTest, ForgetsAllThatWasDecoded) {
+    deliver(idleRecord());
+    queue.advance(2s);
+    const std::string path = "/Process CS/MM Service State";
+    ASSERT_EQ(shown(path), "REG_STATE_IDLE");
+    deliver(idleRecord());
+    model->forget();
+    EXPECT_FALSE(model->isConnected());
+    EXPECT_EQ(model->topLevelNodes(), nullptr);
+    EXPECT_EQ(model->nodeAtPath(path), nullptr);
+    EXPECT_EQ(model->getSaveContents(), nullptr);
+    EXPECT_TRUE(model->state().empty());
+    queue.advance(20s); // neither the timer nor what had arrived redraws
+    EXPECT_EQ(redraws, 1);
+    model->restartMonitor();
+    ASSERT_TRUE(model->isConnected());
+    EXPECT_EQ(shown(path), "(none)");
+    deliver(idleRecord());
+    queue.advance(2s);
+    EXPECT_EQ(shown(path), "REG_STATE_IDLE");
+}
+
 TEST_F(VelmoraModelRunTest, MessageOfAnotherIdIsDroppedWithoutAWord) {
     deliver(idleRecord(), 1);
     deliver(idleRecord(), -1);

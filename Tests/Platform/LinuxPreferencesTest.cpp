@@ -61,6 +61,28 @@ TEST_F(LinuxPreferencesTest, ValueIsWrittenBySynchronizingItsDomain) {
     EXPECT_THAT(log.lines(), IsEmpty());
 }
 
+TEST_F(LinuxPreferencesTest, ValueIsReadAgain) {
+    EXPECT_FALSE(preferences.boolean(domain, "Shown"));
+    preferences.setBoolean(domain, "Shown", true);
+    EXPECT_TRUE(preferences.boolean(domain, "Shown")) << "in this process at once";
+    EXPECT_FALSE(LinuxPreferences(directory.path()).boolean(domain, "Shown"));
+    preferences.synchronize(domain);
+    EXPECT_TRUE(preferences.boolean(domain, "Shown"));
+    EXPECT_TRUE(LinuxPreferences(directory.path()).boolean(domain, "Shown"));
+    EXPECT_FALSE(preferences.boolean(domain, "Other"));
+    EXPECT_FALSE(preferences.boolean("com.velmora.Other", "Shown"));
+    preferences.setBoolean(domain, "Shown", false);
+    EXPECT_FALSE(preferences.boolean(domain, "Shown"));
+    EXPECT_TRUE(log.textsAt(LogPriority::Error).empty());
+}
+
+TEST_F(LinuxPreferencesTest, ListThatCannotBeReadHasNoValue) {
+    put(std::string("<plist><array/></plist>"));
+    EXPECT_FALSE(preferences.boolean(domain, "Shown"));
+    EXPECT_THAT(log.textsAt(LogPriority::Error),
+                ElementsAre("Preferences: " + file().string() + ": holds array, wanted dictionary"));
+}
+
 TEST_F(LinuxPreferencesTest, OtherKeysStay) {
     const Value earlier = dictionary({{"Wallpaper", "stripes"}, {"Shown", true}, {"Rows", 5}});
     put(*writeXMLPropertyList(earlier));

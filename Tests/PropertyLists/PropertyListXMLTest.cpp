@@ -221,6 +221,29 @@ const Bad badInputs[] = {
 INSTANTIATE_TEST_SUITE_P(Inputs, XMLBad, testing::ValuesIn(badInputs),
                          [](const auto& parameter) { return parameter.param.name; });
 
+TEST(XMLReader, DoesNotQuoteAMessage) {
+    const std::string number = "8949027500001234568";
+    const std::pair<std::string, std::string> inputs[] = {
+        {number, "offset 0: text of 19 bytes where an element was wanted"},
+        {"<dict>" + number + "</dict>", "offset 6: text of 19 bytes where an element was wanted"},
+        {"<array><true/>" + number + "</array>", "offset 14: text of 19 bytes where an element was wanted"},
+        {"<true/><n" + number + "/>", "offset 7: a second root element <...>"},
+        {"<n" + number + "/>", "offset 0: <...> where a value was wanted"},
+        {"<dict><n" + number + "/></dict>", "offset 6: <...> where a <key> was wanted"},
+        {"<dict><key>" + number + "</key></dict>", "offset 6: the key of 19 bytes has no value"},
+        {"<string><n" + number + "/></string>", "offset 8: <...> inside <string>"},
+        {"<integer>n" + number + "</integer>", "offset 0: <integer> holds text of 20 bytes, not an integer"},
+        {"<true>1</true>", "offset 0: <true> holds text of 1 byte, not nothing"},
+        {"<string>&n" + number + ";</string>",
+         "offset 8: the text here has the unknown reference of 22 bytes"},
+    };
+    for (const auto& [text, reason] : inputs) {
+        const auto value = readText(text, messageLimits);
+        ASSERT_FALSE(value) << text;
+        EXPECT_EQ(value.reason(), reason);
+    }
+}
+
 TEST(XMLReader, RefusesWhatIsNotWellFormedAndSaysWhere) {
     for (const char* text :
          {"<array>", "<array><string>x</array>", "<array></dict>", "<string>x</string", "<", "<!-- ",

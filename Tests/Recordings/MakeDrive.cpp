@@ -11,6 +11,7 @@
 #include <chrono>
 #include <cstdint>
 #include <cstdio>
+#include <fstream>
 #include <limits>
 #include <memory>
 #include <optional>
@@ -22,6 +23,7 @@
 // waiting for it: so many messages, or with "h" or "s" so many hours or seconds. The same arguments make the
 // same file; a FILE of - is standard output, so that a long drive need not be stored. With --truth it also
 // writes what the drive's phone did, as JSON lines; the recording is the same with and without it.
+// With --identities the numbers and addresses are random ones of the seed, which it lists, one a line.
 
 namespace velmora {
 namespace {
@@ -87,25 +89,47 @@ Result<TruthTime> makeWithTruth(Scenario& scenario, const Length& length, const 
     return last;
 }
 
+/// The value of an option, which is removed with it.
+std::optional<std::string> takeOption(std::vector<std::string>& arguments, const char* name) {
+    const auto option = std::find(arguments.begin(), arguments.end(), name);
+    if (arguments.end() - option < 2)
+        return std::nullopt;
+    std::string value = option[1];
+    arguments.erase(option, option + 2);
+    return value;
+}
+
+/// Gives the drive random identities and lists them, one a line.
+bool plantIdentities(Scenario& scenario, std::uint64_t seed, const std::string& path) {
+    const DriveIdentities identities = DriveIdentities::random(seed);
+    scenario.setIdentities(identities);
+    std::ofstream file(path, std::ios::trunc);
+    for (const std::string& text : identities.texts())
+        file << text << '\n';
+    file.close();
+    return !file.fail();
+}
+
 int run(std::vector<std::string> arguments) {
-    std::optional<std::string> truth;
-    if (const auto option = std::find(arguments.begin(), arguments.end(), "--truth");
-        arguments.end() - option >= 2) {
-        truth = option[1];
-        arguments.erase(option, option + 2);
-    }
+    const std::optional<std::string> truth = takeOption(arguments, "--truth");
+    const std::optional<std::string> identities = takeOption(arguments, "--identities");
     const bool isComplete = arguments.size() == 4;
     const ScenarioKind* kind = isComplete ? scenarioKindNamed(arguments[0]) : nullptr;
     const std::optional<std::uint64_t> seed = isComplete ? numberOf(arguments[1]) : std::nullopt;
     const std::optional<Length> length = isComplete ? lengthOf(arguments[2]) : std::nullopt;
     if (!kind || !seed || !length) {
         std::fprintf(stderr,
-                     "usage: make-drive SCENARIO SEED MESSAGES|HOURSh|SECONDSs FILE [--truth FILE]\n"
+                     "usage: make-drive SCENARIO SEED MESSAGES|HOURSh|SECONDSs FILE [--truth FILE] "
+                     "[--identities FILE]\n"
                      "scenarios: %s\n",
                      scenarioNames().c_str());
         return 2;
     }
     const std::unique_ptr<Scenario> scenario = kind->make(*seed);
+    if (identities && !plantIdentities(*scenario, *seed, *identities)) {
+        std::fprintf(stderr, "make-drive: cannot write %s\n", identities->c_str());
+        return 1;
+    }
     const Result<TruthTime> made = truth ? makeWithTruth(*scenario, *length, arguments[3], *truth)
                                          : make(*scenario, *length, arguments[3]);
     if (!made) {

@@ -35,6 +35,24 @@ TEST(SourceStringTest, readsScenarios) {
     }
 }
 
+TEST(SourceStringTest, LogLinesNameNoIdentity) {
+    const std::pair<const char*, const char*> cases[] = {
+        {"modemmanager", "modemmanager"},
+        {"modemmanager,modem=3", "modemmanager,modem=3"},
+        {"modemmanager,modem=/sys/devices/usb1", "modemmanager,modem=/sys/devices/usb1"},
+        {"modemmanager,modem=490154203237518", "modemmanager,modem=..."},
+        {"modemmanager,sim=8949027500001234568,modem=3", "modemmanager,modem=3,sim=..."},
+        {"modemmanager,sim=/org/SIM/1", "modemmanager,sim=/org/SIM/1"},
+        {"scenario:gsm,seed=4", "scenario:gsm,seed=4"},
+        {"replay:a.pcapng,loop", "replay:a.pcapng,loop"},
+    };
+    for (const auto& [text, logged] : cases) {
+        const auto choice = parseSource(text);
+        ASSERT_TRUE(choice) << text;
+        EXPECT_EQ(loggedSource(text, *choice), logged);
+    }
+}
+
 TEST(SourceStringTest, readsReplays) {
     struct Case {
         const char* text;

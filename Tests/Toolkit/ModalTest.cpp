@@ -120,6 +120,24 @@ TEST_F(ModalTest, CtrlSPressesSave) {
     EXPECT_EQ(std::count(form->log.begin(), form->log.end(), "save"), 2);
 }
 
+TEST_F(ModalTest, WindowsCommandIsCalledWhateverHasTheFocus) {
+    int calls = 0;
+    stage.window.setCommand('M', [&calls] { ++calls; });
+    press(Qt::Key_M, Qt::ControlModifier);
+    EXPECT_EQ(calls, 1);
+    press(Qt::Key_M);
+    press(Qt::Key_M, Qt::ControlModifier | Qt::ShiftModifier);
+    press(Qt::Key_L, Qt::ControlModifier);
+    EXPECT_EQ(calls, 1);
+    const auto form = present();
+    press(Qt::Key_M, Qt::ControlModifier);
+    EXPECT_EQ(calls, 2);
+    form->field.becomeFirstResponder();
+    press(Qt::Key_M, Qt::ControlModifier);
+    EXPECT_EQ(calls, 3);
+    EXPECT_EQ(form->field.text(), "");
+}
+
 TEST_F(ModalTest, WhatIsBelowIsOutOfReach) {
     const auto form = present();
     QTest::mouseClick(stage.window.widget()->windowHandle(), Qt::LeftButton, {}, QPoint(200, 10));

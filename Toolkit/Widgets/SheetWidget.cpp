@@ -58,7 +58,8 @@ bool SheetWidget::event(QEvent* event) {
 
 void SheetWidget::keyPressEvent(QKeyEvent* event) {
     event->accept();
-    if (_isPassive)
+    const auto* const window = dynamic_cast<WindowWidget*>(parentWidget());
+    if ((window && window->runCommand(*event)) || _isPassive)
         return;
     const std::function<void()> action = event->matches(QKeySequence::Save)     ? onSave
                                          : WindowWidget::isBackOrCancel(*event) ? onCancel

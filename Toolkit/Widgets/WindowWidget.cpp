@@ -79,7 +79,18 @@ void WindowWidget::showEvent(QShowEvent* event) {
         windowHandle()->installEventFilter(this); // once, however often it is shown
 }
 
+bool WindowWidget::runCommand(const QKeyEvent& event) const {
+    const auto found = event.modifiers() == Qt::ControlModifier ? commands.find(event.key()) : commands.end();
+    if (found == commands.end())
+        return false;
+    const std::function<void()> command = found->second; // the call may set another one
+    command();
+    return true;
+}
+
 void WindowWidget::keyPressEvent(QKeyEvent* event) {
+    if (runCommand(*event))
+        return;
     if (SheetWidget* const over = sheet()) { // no widget in it has the keyboard focus
         QApplication::sendEvent(over, event);
         return;

@@ -6,6 +6,7 @@
 #include <QWidget>
 
 #include <functional>
+#include <map>
 
 class QKeyEvent;
 
@@ -21,6 +22,8 @@ public:
     std::function<void()> onResize;
     std::function<void()> onCancel;
     std::function<void()> onSave;
+    /// Called for Ctrl and a letter (Qt's number of the key), whatever has the keyboard focus.
+    std::map<int, std::function<void()>> commands;
     /// Called once, when the window's contents are on the screen.
     std::function<void()> onPainted;
     /// Sets the default keyboard focus when no widget has it.
@@ -34,6 +37,8 @@ public:
     /// The active window of the program, or else any that is on the screen; null when there is none.
     [[nodiscard]] static WindowWidget* main();
     [[nodiscard]] static bool isBackOrCancel(const QKeyEvent& event);
+    /// Calls the command of these keys; false where there is none.
+    [[nodiscard]] bool runCommand(const QKeyEvent& event) const;
 
     /// Calls onPainted soon if the screen shows the window; else its first exposure does.
     void checkPainted();

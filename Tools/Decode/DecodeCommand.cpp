@@ -16,6 +16,8 @@
 #include "Tools/Decode/ShownProgress.h"
 #include "Tools/ExitStatus.h"
 #include "Tools/Log/DecoderLog.h"
+#include "Tools/Mask/MaskOption.h"
+#include "Tools/Mask/MaskedInput.h"
 #include "Tools/Output.h"
 #include "Tools/Report.h"
 
@@ -69,12 +71,20 @@ DecodingRequest requestFor(const std::string& path, const DecodeOptions& options
     return request;
 }
 
+/// What decoding the files has in common.
+struct Work {
+    DecodeOptions options;
+    std::optional<MaskOptions> masking;
+    FileTechnologies technologies;
+    SampleColumns columns;
+};
+
 /// Decodes one file and prints it. Returns whether all of it was read.
-bool decodeFile(std::size_t index, const DecodeOptions& options, bool showsProgress,
-                FileTechnologies& technologies, SampleColumns& columns, DecoderLines& lines, Output& output) {
+bool decodeFile(std::size_t index, bool showsProgress, Work& work, DecoderLines& lines, Output& output) {
+    const DecodeOptions& options = work.options;
     const std::string& path = options.files[index];
     const std::string title = fileTitle(path);
-    DecodingRequest request = requestFor(path, options, technologies);
+    DecodingRequest request = requestFor(path, options, work.technologies);
     // What has been decoded is written before more is waited for: at the other end a reader may wait for it.
     std::unique_ptr<DecodeWriter> writer;
     std::optional<ShownProgress> progress;
@@ -94,7 +104,7 @@ bool decodeFile(std::size_t index, const DecodeOptions& options, bool showsProgr
         return false;
     }
     const bool isLive = !inputSize(path);
-    writer = DecodeWriter::make(options, index, isLive, columns, output);
+    writer = DecodeWriter::make(options, index, isLive, work.columns, output);
     if (showsProgress)
         progress.emplace(**reader, path, writesAsItGoes(options));
     const auto clearProgress = [&progress] {
@@ -110,7 +120,8 @@ bool decodeFile(std::size_t index, const DecodeOptions& options, bool showsProgr
     request.progress = progress ? progress->get() : nullptr;
     // Over the progress line, which only lines that are written replace.
     const DecoderLog log(lines);
-    const Result<DecodedFile> decoded = decodeMessages(**reader, request, context, *writer);
+    MaskedInput input(**reader, path, request.technology, request.technologies, work.masking);
+    const Result<DecodedFile> decoded = decodeMessages(input.reader(), request, context, *writer);
     clearProgress();
     if (decoded)
         for (const Decoded& technology : decoded->technologies)
@@ -136,8 +147,15 @@ std::string headerOf(const DecodeOptions& options, const SampleColumns& columns)
 } // namespace
 
 int runDecode(const DecodeOptions& given, DecoderLines& lines, Output& output) {
-    DecodeOptions options = given;
-    FileTechnologies technologies;
+    const Result<std::optional<MaskOptions>> masking = maskOptionsOf(given.mask);
+    if (!masking) {
+        report(masking.reason());
+        return ExitStatus::BadInput;
+    }
+    Work work{given, *masking, {}, {}};
+    DecodeOptions& options = work.options;
+    FileTechnologies& technologies = work.technologies;
+    SampleColumns& columns = work.columns;
     options.hasTechnologyColumn = needsTechnologyColumn(options, technologies);
     const KnownCatalogues known(options.selection, options.technology, options.files, technologies);
     const auto problem =
@@ -146,7 +164,6 @@ int runDecode(const DecodeOptions& given, DecoderLines& lines, Output& output) {
         report("--select: " + *problem);
         return ExitStatus::Usage;
     }
-    SampleColumns columns;
     for (const Catalogue* const catalogue : known.catalogues())
         columns.add(options.selection, *catalogue);
     if (options.format == DecodeOptions::Format::Csv)
@@ -158,13 +175,13 @@ int runDecode(const DecodeOptions& given, DecoderLines& lines, Output& output) {
     bool good = true;
     if (jobs > 1) {
         const Job job = [&](std::size_t index, Output& part) {
-            return decodeFile(index, options, false, technologies, columns, lines, part);
+            return decodeFile(index, false, work, lines, part);
         };
         good = JobScheduler(options.files.size(), jobs, job, output).run();
     } else {
         try {
             for (std::size_t index = 0; index < options.files.size() && output.isOpen(); ++index)
-                good = decodeFile(index, options, true, technologies, columns, lines, output) && good;
+                good = decodeFile(index, true, work, lines, output) && good;
         } catch (const ImpossiblePath& impossible) {
             report(std::string("--select: ") + impossible.what());
             return ExitStatus::Usage;

@@ -119,6 +119,7 @@ CLI::App* addDecode(CLI::App& app, DecodeOptions& options) {
                       "With --from: decode from the beginning, and write from that time on what decoding "
                       "without --from would write");
     addTechnology(*command, options.technology, "Decode as");
+    addMaskOption(*command, options.mask);
     command->add_flag("--strict", options.isStrict,
                       "End at a message that ends the application; by default it is counted, reported and "
                       "left out");
@@ -131,7 +132,7 @@ CLI::App* addDecode(CLI::App& app, DecodeOptions& options) {
         "A csv cell without a value is empty.\n\n"
         "Of a file of several technologies each is decoded by itself: text and json have one display after\n"
         "the other, and each line of jsonl and csv names its technology.\n\n" +
-        std::string(timeHelp) +
+        std::string(timeHelp) + "\n" + maskHelp +
         "\nExamples:\n"
         "  velmora-log decode drive.pcapng\n"
         "  velmora-log decode --format json drive.pcapng | jq .display\n"
@@ -144,6 +145,7 @@ CLI::App* addDecode(CLI::App& app, DecodeOptions& options) {
         "  velmora-log decode --max-age 5 --format csv --select '/GSM/GSM Serving Cell/RSSI' drive.pcapng\n"
         "  velmora-log decode --warm --from 2026-11-16T05:00:00Z --format jsonl drive.pcapng\n"
         "  velmora-log decode --from 2026-11-16T05:00:00Z --select /GSM drive.pcapng\n"
+        "  velmora-log decode --mask drive.pcapng\n"
         "  velmora-log decode --format jsonl --jobs 4 monday/*.pcapng > monday.jsonl\n"
         "  velmora-log decode --technology Ostrel_GSM - < drive.pcapng");
     command->callback([&options] { checkTogether(options); });

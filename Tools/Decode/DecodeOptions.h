@@ -4,6 +4,7 @@
 #pragma once
 
 #include "Tools/Decode/Paths/NodeSelection.h"
+#include "Tools/Mask/MaskOption.h"
 #include "Tools/Messages/MessageSelection.h"
 #include "Tools/Text/CSVText.h"
 
@@ -41,7 +42,8 @@ struct DecodeOptions {
     MessageSelection messages;
     std::string technology; ///< overrides the file's, or chooses one of several; empty for the file's
     bool isStrict = false;  ///< a message that ends the application ends decoding as well
-    std::size_t jobs = 1;   ///< how many files are decoded in parallel
+    MaskOption mask;
+    std::size_t jobs = 1; ///< how many files are decoded in parallel
     std::vector<std::string> files;
     /// Csv rows name their technology. Not an option: it follows from the files.
     bool hasTechnologyColumn = false;

@@ -10,11 +10,11 @@
 
 namespace velmora {
 
-/// A random key.
-[[nodiscard]] Result<MaskKey> randomKey();
-
 /// The key in a file, which only its owner may be able to read. The reason names the file.
 [[nodiscard]] Result<MaskKey> readKeyFile(const std::string& path);
+
+/// The key in that file, or a random one where there is no name.
+[[nodiscard]] Result<MaskKey> keyFor(const std::string& path);
 
 /// Makes a file with a random key, for its user alone. Fails where the file exists. The reason names it.
 [[nodiscard]] Result<Done> makeKeyFile(const std::string& path);

@@ -13,7 +13,6 @@
 #include "Recording/OpenMessages.h"
 #include "Tools/Decode/Decoding.h"
 #include "Tools/ExitStatus.h"
-#include "Tools/Mask/KeyFile.h"
 #include "Tools/Mask/ReportText.h"
 #include "Tools/Output.h"
 #include "Tools/Report.h"
@@ -115,7 +114,7 @@ Result<Done> searchFile(KnownValues& known, const std::string& path) {
 
 Result<MaskReport> identitiesLeft(const MaskCommandOptions& options, bool& isWhole) {
     Result<std::unique_ptr<ByteSource>> source = FileSource::open(options.file);
-    const Result<MaskKey> key = randomKey();
+    const Result<MaskKey> key = MaskKey::random();
     if (!source || !key)
         return Failure{source ? key.reason() : options.file + ": " + source.reason()};
     MaskOptions masking{*key, options.level};

@@ -4,13 +4,13 @@
 #include "Tools/Mask/MaskCommand.h"
 
 #include "Export/Masking/MessageMask.h"
-#include "Export/Masking/SealedFile.h"
 #include "Platform/Linux/Files/AtomicFile.h"
 #include "Recording/OpenMessages.h"
 #include "Tools/Decode/Decoding.h"
 #include "Tools/ExitStatus.h"
 #include "Tools/Mask/KeyFile.h"
 #include "Tools/Mask/MaskCheck.h"
+#include "Tools/Mask/MaskOption.h"
 #include "Tools/Mask/Masking.h"
 #include "Tools/Mask/ReportText.h"
 #include "Tools/Output.h"
@@ -18,7 +18,6 @@
 #include "Tools/OverwriteTarget.h"
 #include "Tools/Report.h"
 
-#include <algorithm>
 #include <filesystem>
 #include <memory>
 #include <optional>
@@ -33,24 +32,11 @@ namespace {
 constexpr mode_t newFileMode = S_IRUSR | S_IWUSR;
 
 Result<MaskOptions> maskOptions(const MaskCommandOptions& options) {
-    const Result<MaskKey> key = options.keyFile.empty() ? randomKey() : readKeyFile(options.keyFile);
+    const Result<MaskKey> key = keyFor(options.keyFile);
     if (!key)
         return Failure{key.reason()};
-    MaskOptions result{*key, options.level, options.keepsUnknown};
-    // What this key has masked already stays as it is. A file that cannot be read twice is masked again.
-    std::error_code error;
-    if (options.keyFile.empty() || options.file == "-" ||
-        !std::filesystem::is_regular_file(options.file, error))
-        return result;
-    Result<std::unique_ptr<ByteSource>> source = FileSource::open(options.file);
-    if (!source)
-        return result; // as will be reported
-    if (const auto seal = readSeal(ChunkedInput(*std::move(source)));
-        seal && seal->key == key->fingerprint()) {
-        result.done = seal->level;
-        result.level = std::max(result.level, seal->level);
-    }
-    return result;
+    const MaskOptions masking{*key, options.level, options.keepsUnknown};
+    return options.keyFile.empty() ? masking : maskOptionsFor(options.file, masking);
 }
 
 /// Whether all of the input is in the output now.

@@ -40,8 +40,10 @@ constexpr const char* connecting = "Connecting...";
 /// The model's observer: passes each refresh to the view, and keeps the status line up to date in between.
 class Watcher final : public ModelObserver {
 public:
-    Watcher(const WatchOptions& options, DecoderLines& lines, Output& output, ServiceClient& client)
-        : _client(client), _lines(lines), _options(options), _model(newModel()) {
+    /// `mask` may be null, for messages as they are.
+    Watcher(const WatchOptions& options, DecoderLines& lines, Output& output, ServiceClient& client,
+            MessageMask* mask)
+        : _client(client), _lines(lines), _options(options), _mask(mask), _model(newModel()) {
         if (!_options.once && Terminal::isThere()) {
             watchEvents();
             _view = std::make_unique<ScreenView>([this] { _client.loop.quit(ExitStatus::Done); });
@@ -110,7 +112,7 @@ private:
             if (_events)
                 _events->take(message);
         };
-        return std::make_shared<WatchModel>(_client.platform(), this, _lines, std::move(events));
+        return std::make_shared<WatchModel>(_client.platform(), this, _lines, std::move(events), _mask);
     }
 
     /// Shows the latest events, for which the messages are decoded once more.
@@ -168,6 +170,7 @@ private:
     ServiceClient& _client;
     DecoderLines& _lines;
     const WatchOptions& _options;
+    MessageMask* _mask;
     bool _hasRefresh = false;
     std::optional<AllCatalogues> _catalogues;
     std::optional<RuleSet> _rules;
@@ -184,9 +187,17 @@ private:
 } // namespace
 
 int runWatch(const WatchOptions& options, DecoderLines& lines, Output& output) {
+    const Result<std::optional<MaskOptions>> masking = maskOptionsOf(options.mask);
+    if (!masking) {
+        report(masking.reason());
+        return ExitStatus::BadInput;
+    }
+    std::optional<MessageMask> mask;
+    if (*masking)
+        mask.emplace(**masking);
     returnLargeAllocations();
     ServiceClient client;
-    const int status = Watcher(options, lines, output, client).run();
+    const int status = Watcher(options, lines, output, client, mask ? &*mask : nullptr).run();
     return output.state() == Output::State::Failed ? ExitStatus::BadInput : status;
 }
 

@@ -3,6 +3,7 @@
 
 #pragma once
 
+#include "Export/Masking/MessageMask.h"
 #include "Model/VelmoraModel.h"
 #include "Tools/Log/DecoderLog.h"
 
@@ -25,14 +26,21 @@ public:
         std::function<void(const Data& message)> message = {}; ///< may be null
     };
 
-    WatchModel(ModelPlatform platform, ModelObserver* observer, DecoderLines& lines, Events events)
-        : VelmoraModel(std::move(platform), observer), _lines(lines), _events(std::move(events)) {}
+    /// `mask` may be null, for messages as they are; it must outlive the model.
+    WatchModel(ModelPlatform platform, ModelObserver* observer, DecoderLines& lines, Events events,
+               MessageMask* mask = nullptr)
+        : VelmoraModel(platform, observer), _clock(platform.clock), _lines(lines), _events(std::move(events)),
+          _mask(mask) {}
 
     void updateWithData(const Data& data) override {
         const DecoderLog log(_lines);
-        VelmoraModel::updateWithData(data);
-        if (_events.message)
-            _events.message(data);
+        if (!_mask)
+            return take(data);
+        LoggedMessage message;
+        message.time = _clock.now();
+        message.message = data;
+        if (const auto masked = _mask->mask(std::move(message), shortTechnologyName(_technology)))
+            take(masked->message);
     }
 
 protected:
@@ -52,8 +60,17 @@ protected:
     }
 
 private:
+    /// The message, masked where it is to be.
+    void take(const Data& data) {
+        VelmoraModel::updateWithData(data);
+        if (_events.message)
+            _events.message(data);
+    }
+
+    const Clock& _clock;
     DecoderLines& _lines;
     Events _events;
+    MessageMask* _mask;
     std::string _technology;
 };
 

@@ -25,12 +25,16 @@ CLI::App* addWatch(CLI::App& app, WatchOptions& options) {
         ->default_str("warning")
         ->check(oneOf({"info", "warning", "critical"}))
         ->type_name("info|warning|critical");
+    addMaskOption(*command, options.mask);
     command->footer(
         "On a terminal the screen is redrawn in place: arrows, j, k, PgUp, PgDn, Home and End scroll,\n"
         "q quits; a line above the last one has the latest events. On a pipe each refresh is printed, one "
-        "after another.\n\n"
+        "after another.\n\n" +
+        std::string(maskHelp) +
+        "\n"
         "Examples:\n"
         "  velmora-log watch\n"
+        "  velmora-log watch --mask\n"
         "  velmora-log watch --bell critical\n"
         "  velmora-log watch --once | grep -A20 'Serving Cell'");
     return command;

@@ -4,6 +4,7 @@
 #pragma once
 
 #include "Analysis/Events/Event.h"
+#include "Tools/Mask/MaskOption.h"
 
 #include <optional>
 
@@ -18,6 +19,7 @@ struct WatchOptions {
     bool once = false;                     ///< print the first refresh and end
     std::optional<double> timeout_seconds; ///< with `once`: how long to wait for that
     std::optional<Severity> bell;          ///< the bell rings for events of at least this severity
+    MaskOption mask;
 };
 
 /// Adds the command with its options, help and examples. Parsing fills `options`, which must outlive `app`.

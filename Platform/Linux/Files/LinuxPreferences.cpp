@@ -32,6 +32,28 @@ bool isBinary(Bytes list) {
     return list.size() >= mark.size() && std::equal(mark.begin(), mark.end(), list.begin());
 }
 
+/// A domain's values and their form.
+struct Earlier {
+    Value values;
+    bool isBinary = false;
+};
+
+/// No values where there is no file.
+Result<Earlier> readValues(const std::filesystem::path& path) {
+    std::error_code error;
+    if (!std::filesystem::exists(path, error))
+        return Earlier{makeDictionary()};
+    const auto content = readFile(path, maximumListSize);
+    if (!content)
+        return Failure{content.reason()};
+    auto list = readPropertyList(content->bytes());
+    if (!list)
+        return Failure{list.reason()};
+    if (!list->asDictionary())
+        return Failure{"holds " + std::string(nameOf(list->kind())) + ", wanted dictionary"};
+    return Earlier{*std::move(list), isBinary(content->bytes())};
+}
+
 /// The list in the form that it had.
 Result<std::vector<std::uint8_t>> serialize(const DictionaryRef& values, bool binary) {
     if (binary)
@@ -52,6 +74,23 @@ LinuxPreferences::LinuxPreferences(std::filesystem::path directory, std::string 
     : _directory(directory.empty() ? userDirectory("XDG_CONFIG_HOME", ".config") : std::move(directory)),
       _busAddress(std::move(busAddress)) {}
 
+std::filesystem::path LinuxPreferences::pathOf(std::string_view domain) const {
+    return _directory / (std::string(domain) + ".plist");
+}
+
+bool LinuxPreferences::boolean(std::string_view domain, std::string_view key) const {
+    const auto changes = _changes.find(domain);
+    if (changes != _changes.end() && changes->second.contains(key))
+        return changes->second[key] == Value(true);
+    if (!isDomain(domain))
+        return false;
+    const std::filesystem::path path = pathOf(domain);
+    const auto earlier = readValues(path);
+    if (!earlier)
+        logFormat(LogPriority::Error, "Preferences: %s: %s", path.c_str(), earlier.reason().c_str());
+    return earlier && (*earlier->values.asDictionary())[key] == Value(true);
+}
+
 void LinuxPreferences::setBoolean(std::string_view domain, std::string_view key, bool value) {
     if (!isDomain(domain)) {
         logFormat(LogPriority::Error, "Preferences: \"%.*s\" is no domain's name",
@@ -65,7 +104,7 @@ void LinuxPreferences::synchronize(std::string_view domain) {
     const auto changes = _changes.find(domain);
     if (changes == _changes.end())
         return;
-    std::filesystem::path path = _directory / (changes->first + ".plist");
+    std::filesystem::path path = pathOf(domain);
     // The file that a link leads to is the one that is replaced.
     std::error_code error;
     if (const auto target = std::filesystem::canonical(path, error); !error)
@@ -79,28 +118,18 @@ void LinuxPreferences::synchronize(std::string_view domain) {
 }
 
 Result<Done> LinuxPreferences::write(const std::filesystem::path& path, const Dictionary& changes) const {
+    const auto earlier = readValues(path);
+    if (!earlier)
+        return Failure{earlier.reason()};
     const auto values = makeDictionary();
-    bool binary = false;
-    std::error_code error;
-    if (std::filesystem::exists(path, error)) {
-        const auto content = readFile(path, maximumListSize);
-        if (!content)
-            return Failure{content.reason()};
-        const auto list = readPropertyList(content->bytes());
-        if (!list)
-            return Failure{list.reason()};
-        const Dictionary* earlier = list->asDictionary();
-        if (!earlier)
-            return Failure{"holds " + std::string(nameOf(list->kind())) + ", wanted dictionary"};
-        for (const auto& [key, value] : *earlier)
-            values->set(key, value);
-        binary = isBinary(content->bytes());
-    }
+    for (const auto& [key, value] : *earlier->values.asDictionary())
+        values->set(key, value);
     for (const auto& [key, value] : changes)
         values->set(key, value);
-    const auto bytes = serialize(values, binary);
+    const auto bytes = serialize(values, earlier->isBinary);
     if (!bytes)
         return Failure{bytes.reason()};
+    std::error_code error;
     std::filesystem::create_directories(path.parent_path(), error);
     return replaceFile(path, *bytes);
 }

@@ -25,11 +25,13 @@ public:
     /// An empty `directory` means $XDG_CONFIG_HOME (~/.config), an empty `busAddress` the session's bus.
     explicit LinuxPreferences(std::filesystem::path directory = {}, std::string busAddress = {});
 
+    [[nodiscard]] bool boolean(std::string_view domain, std::string_view key) const override;
     void setBoolean(std::string_view domain, std::string_view key, bool value) override;
     void synchronize(std::string_view domain) override;
     void announceChange(std::string_view domain, std::string_view key) override;
 
 private:
+    [[nodiscard]] std::filesystem::path pathOf(std::string_view domain) const;
     [[nodiscard]] Result<Done> write(const std::filesystem::path& path, const Dictionary& changes) const;
 
     std::filesystem::path _directory;

@@ -33,6 +33,8 @@ class C2KScenario final : public DriveScenario {
 public:
     explicit C2KScenario(std::uint64_t seed);
     [[nodiscard]] std::string_view technology() const override;
+    /// The records have none of them: the UATI is the network's, and random anyway.
+    void setIdentities(const DriveIdentities& /*identities*/) override {}
 
     /// What the messages are of: the phone and the cells around it after the last step.
     [[nodiscard]] const C2KPhone& phone() const { return _phone; }

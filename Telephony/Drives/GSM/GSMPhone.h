@@ -3,6 +3,7 @@
 
 #pragma once
 
+#include "Telephony/Drives/DriveIdentities.h"
 #include "Telephony/Drives/GSM/GSMCellRecords.h"
 #include "Telephony/Drives/GSM/RegistrationRecords.h"
 #include "Telephony/Drives/GSM/UMTSRecords.h"
@@ -33,6 +34,7 @@ struct GSMPhone {
     records::RRState rr = records::RRState::Inactive;
     records::RRCState rrc = records::RRCState::Disconnected;
 
+    DriveIdentities identities;
     bool registered = false;
     CellArea registeredArea{{1, 1}, 4101, 1}; ///< its last registration
     Radio registeredRadio = Radio::Off;       ///< the radio of that registration

@@ -9,7 +9,7 @@ using namespace records;
 
 void GSMProcedures::powerOn(double now) {
     const CellArea lastArea = _phone.registeredArea; // the SIM remembers it
-    _phone = GSMPhone{};
+    restart(_phone);
     _phone.registeredArea = lastArea;
     _phone.radio = GSMPhone::Radio::Searching;
     addRegistrationStep(now + 0.1, RegistrationState::Inactive);

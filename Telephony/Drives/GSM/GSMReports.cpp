@@ -120,7 +120,7 @@ Report cellArray(Context& context) {
 
 Report sim(Context& context) {
     context.binary = !context.binary;
-    return simFiles(*testSIM(context.phone.registeredArea), context.binary);
+    return simFiles(*testSIM(context.phone.registeredArea, context.phone.identities), context.binary);
 }
 
 constexpr GSMReport offReports[] = {{2, registrationReport}, {30, sim}};

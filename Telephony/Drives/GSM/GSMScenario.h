@@ -35,6 +35,7 @@ class GSMScenario final : public DriveScenario {
 public:
     explicit GSMScenario(std::uint64_t seed);
     [[nodiscard]] std::string_view technology() const override;
+    void setIdentities(const DriveIdentities& identities) override { _phone.identities = identities; }
 
     /// What the messages are of: the phone and the cells around it after the last step.
     [[nodiscard]] const GSMPhone& phone() const { return _phone; }

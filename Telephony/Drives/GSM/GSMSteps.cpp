@@ -63,7 +63,7 @@ void GSMSteps::addContextsStep(double at, int count) {
         _phone.contexts = count;
         std::vector<DictionaryRef> contexts;
         for (int number = 1; number <= count; ++number)
-            contexts.push_back(testContext(number));
+            contexts.push_back(testContext(number, _phone.identities));
         _binary = !_binary;
         return packetContexts(contexts, _binary);
     });

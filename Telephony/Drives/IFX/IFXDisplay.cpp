@@ -119,7 +119,7 @@ Value packetData(const IFXPhone& phone) {
         contexts->append(dictionary({
             {"Context ID", std::to_string(number)},
             {"APN", number == 1 ? "internet.test" : "mms.test"},
-            {"Address", number == 1 ? "192.0.2.17" : "2001:db8::17"},
+            {"Address", (number == 1 ? phone.identities.addresses : phone.identities.addresses6) + "17"},
         }));
     const DictionaryRef node = dictionary({{"Contexts", contexts}});
     if (phone.contexts > 0)
@@ -136,7 +136,7 @@ Value ifxDisplay(const IFXPhone& phone, const RadioNetwork& network) {
     root->set("Neighbor Cells", neighbours(phone, network));
     root->set("Dedicated Channel", dedicatedChannel(phone));
     root->set("Packet Data", packetData(phone));
-    root->set("SIM", dictionary({{"ICCID", "8900101000000000017"}}));
+    root->set("SIM", dictionary({{"ICCID", phone.identities.sims[0].iccid}}));
     return root;
 }
 

@@ -4,6 +4,7 @@
 #pragma once
 
 #include "PropertyLists/Value.h"
+#include "Telephony/Drives/DriveIdentities.h"
 #include "Telephony/Drives/RadioNetwork.h"
 
 #include <cstdint>
@@ -15,6 +16,7 @@ namespace velmora {
 struct IFXPhone {
     enum class State : std::uint8_t { Searching, Limited, Registering, Idle, Call, PacketSession };
 
+    DriveIdentities identities;
     State state = State::Searching;
     std::optional<GSMMeasurement> serving; ///< none while it searches
     CellArea registeredArea{{1, 1}, 4101, 1};

@@ -181,14 +181,14 @@ Report candidates(Context& context) {
 Report contexts(Context& context) {
     std::vector<DictionaryRef> list;
     for (int number = 1; number <= context.phone.contexts; ++number)
-        list.push_back(testContext(number));
+        list.push_back(testContext(number, context.phone.identities));
     context.binary = !context.binary;
     return packetContexts(list, context.binary);
 }
 
 Report sim(Context& context) {
     context.binary = !context.binary;
-    return simFiles(*testSIM(context.phone.registeredArea), context.binary);
+    return simFiles(*testSIM(context.phone.registeredArea, context.phone.identities), context.binary);
 }
 
 } // namespace lteReports

@@ -3,6 +3,7 @@
 
 #pragma once
 
+#include "Telephony/Drives/DriveIdentities.h"
 #include "Telephony/Drives/LTE/LTERecords.h"
 #include "Telephony/Drives/PeriodicReport.h"
 
@@ -18,6 +19,7 @@ struct LTEPhone {
     enum class Radio : std::uint8_t { Off, Searching, Camped };
 
     Radio radio = Radio::Off;
+    DriveIdentities identities;
     bool connected = false;
     std::size_t carrier = 0;               ///< on which it is or searches; index into `lteCarriers`
     std::optional<LTEMeasurement> serving; ///< none unless it camps

@@ -75,7 +75,7 @@ void LTEScenario::addContextsStep(double delay, int count) {
 
 void LTEScenario::powerOn() {
     const CellArea lastArea = _phone.registeredArea; // the SIM remembers it
-    _phone = LTEPhone{};
+    restart(_phone);
     _phone.registeredArea = lastArea;
     _phone.radio = LTEPhone::Radio::Searching;
     addContextsStep(0.2, 0);

@@ -36,6 +36,7 @@ class LTEScenario final : public DriveScenario {
 public:
     explicit LTEScenario(std::uint64_t seed);
     [[nodiscard]] std::string_view technology() const override;
+    void setIdentities(const DriveIdentities& identities) override { _phone.identities = identities; }
 
     /// What the messages are of: the phone and the cells around it after the last step.
     [[nodiscard]] const LTEPhone& phone() const { return _phone; }

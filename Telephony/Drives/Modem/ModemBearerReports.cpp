@@ -21,22 +21,23 @@ const char* interfaceOf(const ModemBearer& bearer) {
     return bearer.isIPv6 ? "qmimux1" : "qmimux0";
 }
 
-Value addresses(bool isIPv6, int bearer) {
+Value addresses(bool isIPv6, int bearer, const DriveIdentities& identities) {
     const ArrayRef servers = makeArray();
-    for (const char* each : {isIPv6 ? "2001:db8::53" : "192.0.2.53", isIPv6 ? "2001:db8::54" : "192.0.2.54"})
-        servers->append(each);
+    for (const char* each : {"53", "54"})
+        servers->append((isIPv6 ? identities.addresses6 : identities.addresses) + each);
+    const std::string& begin = isIPv6 ? identities.bearerAddresses6 : identities.bearerAddresses;
     const std::string number = std::to_string(16 + bearer);
     return Value(std::make_shared<Dictionary>(Dictionary{
         {std::string(kVoxContextMethod), staticMethod},
-        {std::string(kVoxContextAddress), (isIPv6 ? "2001:db8:0:1::" : "198.51.100.") + number},
+        {std::string(kVoxContextAddress), begin + number},
         {std::string(kVoxContextPrefix), isIPv6 ? 64 : 29},
-        {std::string(kVoxContextGateway), isIPv6 ? "2001:db8:0:1::1" : "198.51.100.22"},
+        {std::string(kVoxContextGateway), begin + (isIPv6 ? "1" : "22")},
         {std::string(kVoxContextDNS), Value(servers)},
         {std::string(kVoxContextMTU), isIPv6 ? 1400 : 1500},
     }));
 }
 
-Value contextOf(const ModemBearer& bearer) {
+Value contextOf(const ModemBearer& bearer, const DriveIdentities& identities) {
     const auto context = std::make_shared<Dictionary>();
     context->set(kVoxContextBearer, bearer.number);
     context->set(kVoxContextIsConnected, bearer.isConnected);
@@ -56,8 +57,8 @@ Value contextOf(const ModemBearer& bearer) {
     context->set(kVoxContextStart, Value(floor<seconds>(DriveScenario::startTime()) +
                                          seconds(static_cast<std::int64_t>(bearer.start_s))));
     if (!bearer.isIPv6)
-        context->set(kVoxContextIPv4, addresses(false, bearer.number));
-    context->set(kVoxContextIPv6, addresses(true, bearer.number));
+        context->set(kVoxContextIPv4, addresses(false, bearer.number, identities));
+    context->set(kVoxContextIPv6, addresses(true, bearer.number, identities));
     return Value(context);
 }
 
@@ -92,7 +93,7 @@ std::optional<RecordBuilder> contexts(ModemReportContext& context) {
     const DictionaryRef account = modemAccount(context.phone);
     const ArrayRef list = makeArray();
     for (const ModemBearer& each : context.phone.bearers)
-        list->append(contextOf(each));
+        list->append(contextOf(each, context.phone.identities));
     if (context.phone.isPresent())
         account->set(kVoxContexts, Value(list));
     return modemMessage(LiveModemCode::contexts, account);

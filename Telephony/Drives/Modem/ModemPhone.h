@@ -4,6 +4,7 @@
 #pragma once
 
 #include "LogMessages/LiveModem.h"
+#include "Telephony/Drives/DriveIdentities.h"
 #include "Telephony/Drives/Modem/ModemCell.h"
 
 #include <cstddef>
@@ -54,6 +55,7 @@ struct ModemBearer {
 struct ModemPhone {
     ModemPresence presence = ModemPresence::NoManager;
     std::string reason;
+    DriveIdentities identities;
     int index = 0; ///< ModemManager's number
     MM::State state = MM::State::Initializing;
     bool isLocked = false;     ///< the SIM asks for its PIN

@@ -28,7 +28,7 @@ void ModemScenario::addChange(double delay, const std::function<void()>& change)
 void ModemScenario::addAbsence(ModemPresence presence, const char* reason) {
     addChange(0.1, [this, presence, reason] {
         const int index = _phone.index;
-        _phone = ModemPhone{};
+        restart(_phone);
         _phone.index = index;
         _phone.presence = presence;
         _phone.reason = reason;
@@ -74,7 +74,7 @@ void ModemScenario::findNoModem() {
 
 void ModemScenario::plugInLocked() {
     addChange(0.1, [this] {
-        _phone = ModemPhone{};
+        restart(_phone);
         _phone.presence = ModemPresence::Present;
         _phone.cellReport = ModemCellReport::NotYet;
     });
@@ -186,7 +186,7 @@ void ModemScenario::unplug() {
 void ModemScenario::returnWithoutSIM() {
     addChange(0.1, [this] {
         const int index = _phone.index + 1;
-        _phone = ModemPhone{};
+        restart(_phone);
         _phone.index = index;
         _phone.presence = ModemPresence::Present;
         _phone.state = MM::State::Failed;

@@ -62,7 +62,7 @@ std::optional<RecordBuilder> modem(ModemReportContext& context) {
     account->set(kVoxModemModel, "TM 5000");
     account->set(kVoxModemRevision, "01.02.03");
     account->set(kVoxModemHardware, "10000");
-    account->set(kVoxModemEquipment, "001010999999990"); // no maker's, and its check digit is wrong
+    account->set(kVoxModemEquipment, phone.identities.equipment);
     account->set(kVoxModemDevice, "/sys/devices/pci0000:00/0000:00:14.0/usb2/2-1");
     account->set(kVoxModemPlugin, "generic");
     account->set(kVoxModemPort, "cdc-wdm0");

@@ -12,33 +12,29 @@ using namespace records;
 
 namespace {
 
-/// The SIM of a slot: a card, and the profile of an eUICC. Both are of test networks, and their numbers have
-/// wrong check digits.
+/// What the SIM of a slot is beside its identities: a card, and the profile of an eUICC. Both are of test
+/// networks.
 struct TestSIM {
-    const char* iccid;
-    const char* imsi;
     const char* network;
     const char* name;
-    const char* number;
     int type; ///< MMSimType: physical or eUICC
 };
-constexpr TestSIM sims[] = {
-    {"8900101000000000017", "001010000000017", "00101", "Test Network", "+15550100", 1},
-    {"8900102000000000025", "001020000000025", "00102", "Other Test Network", "+15550101", 2},
-};
+constexpr TestSIM sims[] = {{"00101", "Test Network", 1}, {"00102", "Other Test Network", 2}};
 
 Data group(std::uint8_t number) {
     return Data(std::vector<std::uint8_t>{0xA0, number});
 }
 
-void addSIM(Dictionary& account, const TestSIM& sim) {
-    account.set(kSimFile_ICCID, sim.iccid);
-    account.set(kVoxSIMIMSI, sim.imsi);
+void addSIM(Dictionary& account, int slot, const DriveIdentities& identities) {
+    const TestSIM& sim = sims[slot - 1];
+    const DriveIdentities::SIM& identity = identities.sims[static_cast<std::size_t>(slot - 1)];
+    account.set(kSimFile_ICCID, identity.iccid);
+    account.set(kVoxSIMIMSI, identity.imsi);
     const ArrayRef numbers = makeArray();
-    numbers->append(sim.number);
+    numbers->append(withoutSpaces(identity.number));
     account.set(kSimFile_MSISDN, Value(numbers));
     if (sim.type == 2)
-        account.set(kVoxSIMEID, "89001000000000000000000000000099");
+        account.set(kVoxSIMEID, identities.eid);
     account.set(kVoxSIMOperatorCode, sim.network);
     account.set(kVoxSIMOperatorName, sim.name);
     account.set(kVoxSIMGroup1, group(1));
@@ -69,7 +65,7 @@ Value slots(const ModemPhone& phone) {
         slot->set(kVoxSIMSlotIsActive, isActive);
         slot->set(kVoxSIMSlotHasSIM, hasSIM);
         if (hasSIM && !(isActive && phone.isLocked)) {
-            slot->set(kSimFile_ICCID, sim.iccid);
+            slot->set(kSimFile_ICCID, phone.identities.sims[static_cast<std::size_t>(number - 1)].iccid);
             slot->set(kVoxSIMOperatorName, sim.name);
             slot->set(kVoxSIMOperatorCode, sim.network);
         }
@@ -85,7 +81,7 @@ std::optional<RecordBuilder> sim(ModemReportContext& context) {
     const DictionaryRef account = modemAccount(phone);
     if (phone.isPresent()) {
         if (!phone.isLocked && !phone.isSIMMissing)
-            addSIM(*account, sims[phone.slot - 1]);
+            addSIM(*account, phone.slot, phone.identities);
         account->set(kVoxSIMSlots, slots(phone));
     }
     return modemMessage(LiveModemCode::sim, account);

@@ -31,6 +31,7 @@ class ModemScenario final : public DriveScenario {
 public:
     explicit ModemScenario(std::uint64_t seed);
     [[nodiscard]] std::string_view technology() const override;
+    void setIdentities(const DriveIdentities& identities) override { _phone.identities = identities; }
 
     /// What the messages are of: the modem and the cells around it after the last step.
     [[nodiscard]] const ModemPhone& phone() const { return _phone; }

@@ -158,14 +158,14 @@ std::optional<RecordBuilder> utranReports::quality(UTRANReportContext& context) 
 std::optional<RecordBuilder> utranReports::contexts(UTRANReportContext& context) {
     std::vector<DictionaryRef> active;
     for (int number = 1; number <= context.phone.contexts; ++number)
-        active.push_back(testContext(number));
+        active.push_back(testContext(number, context.phone.identities));
     context.binary = !context.binary;
     return packetContexts(active, context.binary);
 }
 
 std::optional<RecordBuilder> utranReports::sim(UTRANReportContext& context) {
     context.binary = !context.binary;
-    return simFiles(*testSIM(context.phone.registeredArea), context.binary);
+    return simFiles(*testSIM(context.phone.registeredArea, context.phone.identities), context.binary);
 }
 
 std::span<const UTRANReport> reportsOf(const UTRANPhone& phone) {

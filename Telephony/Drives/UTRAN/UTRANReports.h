@@ -3,6 +3,7 @@
 
 #pragma once
 
+#include "Telephony/Drives/DriveIdentities.h"
 #include "Telephony/Drives/PeriodicReport.h"
 #include "Telephony/Drives/UTRAN/UTRANRecords.h"
 
@@ -19,6 +20,7 @@ struct UTRANPhone {
     Radio radio = Radio::Off;
     std::optional<UTRANMeasurement> serving; ///< none unless it camps
     records::RRCState rrc = records::RRCState::Disconnected;
+    DriveIdentities identities;
     bool registered = false;
     bool call = false;                        ///< of speech
     int contexts = 0;                         ///< active packet-data contexts

@@ -58,7 +58,7 @@ void UTRANScenario::addContextsStep(double delay, int count) {
 
 void UTRANScenario::powerOn() {
     const CellArea lastArea = _phone.registeredArea; // the SIM remembers it
-    _phone = UTRANPhone{};
+    restart(_phone);
     _phone.registeredArea = lastArea;
     _phone.radio = UTRANPhone::Radio::Searching;
     addRRCStep(0.1, RRCState::Disconnected);

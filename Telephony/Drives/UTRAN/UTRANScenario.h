@@ -32,6 +32,7 @@ class UTRANScenario final : public DriveScenario {
 public:
     explicit UTRANScenario(std::uint64_t seed);
     [[nodiscard]] std::string_view technology() const override;
+    void setIdentities(const DriveIdentities& identities) override { _phone.identities = identities; }
 
     /// What the messages are of: the phone and the cells around it after the last step.
     [[nodiscard]] const UTRANPhone& phone() const { return _phone; }
