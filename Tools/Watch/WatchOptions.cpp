@@ -27,7 +27,7 @@ CLI::App* addWatch(CLI::App& app, WatchOptions& options) {
         ->type_name("info|warning|critical");
     command->footer(
         "On a terminal the screen is redrawn in place: arrows, j, k, PgUp, PgDn, Home and End scroll,\n"
-        "q quits; a line above the last one has the latest events. On a pipe each refresh is printed, one "
+        "q quits; a line above the last one has the latest events. On a pipe each refresh is printed, one\n"
         "after another.\n\n"
         "Examples:\n"
         "  velmora-log watch\n"
