@@ -24,10 +24,12 @@ TEST(CommandLineErrorsTest, UsageErrorsGiveTheFoundAndTheExpectedValue) {
         std::string message;
     };
     const Case cases[] = {
-        {{}, "no command, wanted decode, watch, record, convert, info, fields, events, rules, stats or diff"},
+        {{},
+         "no command, wanted decode, watch, record, convert, info, fields, events, rules, stats, diff, mask "
+         "or columns"},
         {{"bogus"},
-         "got bogus, wanted one of the commands decode, watch, record, convert, info, fields, events, "
-         "rules, stats and diff"},
+         "got bogus, wanted one of the commands decode, watch, record, convert, info, fields, events, rules, "
+         "stats, diff, mask and columns"},
         {{"decode"}, "FILE is required"},
         {{"mask"}, "FILE is required"},
         {{"mask", "a.pcapng"}, "OUT is required"},

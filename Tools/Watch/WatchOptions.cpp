@@ -28,7 +28,7 @@ CLI::App* addWatch(CLI::App& app, WatchOptions& options) {
     addMaskOption(*command, options.mask);
     command->footer(
         "On a terminal the screen is redrawn in place: arrows, j, k, PgUp, PgDn, Home and End scroll,\n"
-        "q quits; a line above the last one has the latest events. On a pipe each refresh is printed, one "
+        "q quits; a line above the last one has the latest events. On a pipe each refresh is printed, one\n"
         "after another.\n\n" +
         std::string(maskHelp) +
         "\n"
