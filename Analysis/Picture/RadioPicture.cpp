@@ -150,7 +150,7 @@ void RadioPicture::change(const MessageReport& report) {
         side.isReported = true;
     }
     for (RadioSideState& each : _sides)
-        if (each.isServing && each.isReported) {
+        if (each.isServing && each.isReported && each.reportsCell(_table)) {
             each.reported = report.time;
             each.message = report.message;
         }
@@ -163,7 +163,7 @@ void RadioPicture::keep(const MessageReport& report) {
             continue;
         RadioSideState& side = _sides[use.side];
         const std::uint32_t row = each.rows.empty() ? 0 : each.rows.back();
-        if (each.kind == ObservedKind::Absent)
+        if (each.kind == ObservedKind::Absent || isZeroForNone(each, use, _table))
             side.readings.forgetLeaf(use.role, *each.leaf);
         else if (isServing(use.role) && !side.reportsCell(_table))
             continue;

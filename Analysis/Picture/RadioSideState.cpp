@@ -23,6 +23,11 @@ bool isOfRow(const Observation& observation, const ModeRow& row) {
 
 } // namespace
 
+bool isZeroForNone(const Observation& observation, const LeafUse& use, const TechnologyTable& table) {
+    return table.hasZerosForNone && observation.number == 0 &&
+           (use.role == Role::ServingCell || use.role == Role::ServingChannel);
+}
+
 CellIdentity RadioSideState::identity() const {
     CellIdentity known;
     known.technology = technology;
@@ -34,6 +39,8 @@ CellIdentity RadioSideState::identity() const {
 
 void RadioSideState::gather(const Observation& observation, const LeafUse& use,
                             const TechnologyTable& table) {
+    if (isZeroForNone(observation, use, table))
+        return;
     isServing = true;
     if (use.list) {
         if (use.role == Role::ServingPhysicalCell)
@@ -83,7 +90,8 @@ bool RadioSideState::takeMode(const Observation& observation, const LeafUse& use
 bool RadioSideState::reportsCell(const TechnologyTable& table) const {
     if (hasNoArea)
         return false;
-    return !table.hasCellInUseAlone || mode == RadioMode::Idle || mode == RadioMode::Connected;
+    return !table.searched || technology != table.searched || mode == RadioMode::Idle ||
+           mode == RadioMode::Connected;
 }
 
 void RadioSideState::forgetCell() {

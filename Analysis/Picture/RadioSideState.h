@@ -67,4 +67,8 @@ private:
     void gatherRow(const Observation& observation, const LeafUse& use);
 };
 
+/// Whether it is a zero in the place of a cell or channel that there is not.
+[[nodiscard]] bool isZeroForNone(const Observation& observation, const LeafUse& use,
+                                 const TechnologyTable& table);
+
 } // namespace velmora

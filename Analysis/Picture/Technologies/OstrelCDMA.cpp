@@ -55,7 +55,8 @@ constinit const TechnologyTable technologies::ostrelCDMA{.name = "Ostrel_CDMA",
                                                          .modes = modes,
                                                          .ignored = ignored,
                                                          .isHybrid = true,
-                                                         .hasCellInUseAlone = true,
+                                                         .hasZerosForNone = true,
+                                                         .searched = RadioTechnology::EVDO,
                                                          .detectors = {.machines = machines, .calls = calls}};
 
 } // namespace velmora

@@ -74,8 +74,10 @@ struct TechnologyTable {
     std::span<const std::string_view> ignored{}; ///< leaves whose role another one has as well
     /// The phone has a serving cell of each radio technology at the same time.
     bool isHybrid = false;
-    /// Only idle and connected do records report a cell; else they have zeros in its place.
-    bool hasCellInUseAlone = false;
+    /// Records have zeros in the place of a cell identity and a channel where there is no cell.
+    bool hasZerosForNone = false;
+    /// Of that technology records report a cell before the phone is on it; it counts when idle and connected.
+    std::optional<RadioTechnology> searched{};
     /// Areas that stand for none: with one of them, a message reports no serving cell.
     std::span<const std::int64_t> noAreas{};
     DetectorTable detectors{};

@@ -80,6 +80,36 @@ TEST(ServingCell, AReservedTrackingAreaReportsNoCell) {
     EXPECT_EQ(nameOf(lte.picture().serving()), "PCI 17 on EARFCN 1300");
 }
 
+TEST(ServingCell, AReservedTrackingAreaDoesNotKeepTheEarlierCell) {
+    LTEEngine lte;
+    lte.serve(0, 17);
+    lte.send(lte.at(4).number(servingPCI, 0).number(servingEARFCN, 1300).number(servingTAC, 0));
+    lte.serve(6, 18);
+    EXPECT_THAT(lte.lines(), IsEmpty());
+}
+
+TEST(ServingCell, OfCDMA2000IsZeroWhereThereIsNone) {
+    constexpr std::string_view base = "/System/Base Station ID";
+    HandMadeEngine c2k{"Ostrel_CDMA", {{base, Role::ServingCell}}};
+    c2k.send(c2k.at(0).state("/Overview/1x State", 4)); // sync
+    c2k.send(c2k.at(1).number(base, 0));
+    c2k.send(c2k.at(2).number(base, 231));
+    c2k.send(c2k.at(2.5).state("/Overview/1x State", 6)); // paging
+    c2k.send(c2k.at(3).number(base, 232));
+    EXPECT_THAT(c2k.linesOf("cell-reselection"), ElementsAre("3.000 cell 231 to cell 232"));
+}
+
+TEST(ServingCell, OfEVDOCountsFromIdleOn) {
+    constexpr std::string_view pilot = "/EV-DO/Serving PN Offset";
+    HandMadeEngine c2k{"Ostrel_CDMA", {{pilot, Role::ServingPhysicalCell}}};
+    c2k.send(c2k.at(0).state("/Overview/EV-DO State", 2).number(pilot, 124)); // sync
+    c2k.send(c2k.at(1).state("/Overview/EV-DO State", 3).number(pilot, 145)); // idle
+    c2k.send(c2k.at(2).state("/Overview/EV-DO State", 5).number(pilot, 145)); // connected
+    c2k.send(c2k.at(3).state("/Overview/EV-DO State", 5).number(pilot, 124));
+    EXPECT_THAT(c2k.linesOf("handover"), ElementsAre("3.000 PN 145 to PN 124"));
+    EXPECT_THAT(c2k.linesOf("cell-reselection"), IsEmpty());
+}
+
 TEST(ServingCell, AReturnWithinTenSecondsIsAPingPong) {
     LTEEngine lte;
     for (const double start : {0.0, 100.0}) {
