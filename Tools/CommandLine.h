@@ -36,7 +36,8 @@ struct CommandLine {
     bool verbose =
         false; ///< decoder lines as they arise, not summed up; those of objects made and destroyed too
     std::variant<Notice, DecodeOptions, WatchOptions, RecordOptions, ConvertOptions, InfoOptions,
-                 FieldsOptions, EventsOptions, RulesOptions, StatsOptions, DiffOptions>
+                 FieldsOptions, EventsOptions, RulesOptions, StatsOptions, DiffOptions, MaskCommandOptions,
+                 ColumnsOptions>
         command;
 };
 
