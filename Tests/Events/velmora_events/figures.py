@@ -36,7 +36,9 @@ class Figures:
         happened = self.both + self.missed
         return self.both / happened if happened else None
 
-    def is_short_of(self, needed: float) -> bool:
+    def is_short_of(self, needed: float | None) -> bool:
+        if needed is None:
+            return False
         return any(share is not None and share < needed for share in (self.precision, self.recall))
 
 
@@ -49,6 +51,12 @@ def _share(share: float | None) -> str:
         return "–"
     # Rounded down: what is short of 1 must not look like it.
     return f"{int(share * 10_000) / 10_000:.4f}"
+
+
+def _remark(kind: str, technology: str, figures: Figures) -> str:
+    if needed(kind, technology) is None:
+        return "only shown"
+    return "short" if figures.is_short_of(needed(kind, technology)) else ""
 
 
 def rows(table: Table) -> list[tuple[str, ...]]:
@@ -67,7 +75,7 @@ def rows(table: Table) -> list[tuple[str, ...]]:
                     str(found),
                     _share(figures.precision),
                     _share(figures.recall),
-                    "short" if figures.is_short_of(needed(kind, technology)) else "",
+                    _remark(kind, technology, figures),
                 ))
     return lines
 

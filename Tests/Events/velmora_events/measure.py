@@ -11,6 +11,7 @@ from pathlib import Path
 from velmora_events.drives import ROUNDS_S, Drive, Problem
 from velmora_events.events import Event
 from velmora_events.figures import Figures, Table, as_markdown, as_text, rows, short_kinds
+from velmora_events.kinds import SHOWN_ONLY
 from velmora_events.matching import Outcome, match
 
 DESCRIPTION = """Precision and recall of each kind of events.
@@ -20,7 +21,8 @@ lists what it finds in the recording. Each event that happened is matched with a
 same kind and within the kind's tolerance. What no record states is not counted.
 
 The exit status is 1 when a kind that records state is not found exactly, or a derived one with less than 0.98 of
-either figure, and 2 when the call was wrong or a program failed.
+either figure, and 2 when the call was wrong or a program failed. A few kinds are short in a scenario for a known
+reason: these are only shown.
 """
 
 
@@ -100,4 +102,7 @@ def main(arguments: Sequence[str] | None = None) -> int:
     short = short_kinds(measurement.table)
     for each in short:
         print(f"short: {each}")
+    for (kind, scenario), reason in SHOWN_ONLY.items():
+        if (kind, scenario) in measurement.table:
+            print(f"only shown: {kind} of {scenario}: {reason}")
     return 1 if short else 0

@@ -26,6 +26,11 @@ class FiguresTest(unittest.TestCase):
         table = {("context-up", "lte"): nearly, ("handover", "lte"): nearly, ("handover", "gsm"): Figures(97, 3)}
         self.assertEqual(short_kinds(table), ["context-up of lte", "handover of gsm"])
 
+    def test_what_is_only_shown_is_never_short(self) -> None:
+        table = {("pilot-pollution", "lte"): Figures(1, 9), ("pilot-pollution", "c2k"): Figures(1, 9)}
+        self.assertEqual(short_kinds(table), ["pilot-pollution of c2k"])
+        self.assertEqual([row[-1] for row in rows(table)], ["short", "only shown"])
+
     def test_shares_are_never_rounded_up(self) -> None:
         (row,) = rows({("context-up", "lte"): Figures(both=99_999, missed=1)})
         self.assertEqual(row, ("context-up", "stated", "lte", "100000", "99999", "1.0000", "0.9999", "short"))
