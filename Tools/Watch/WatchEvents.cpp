@@ -6,6 +6,7 @@
 #include "Platform/DateText.h"
 #include "Platform/PrintableText.h"
 #include "Tools/Events/EventAnalysis.h"
+#include "Tools/LogOverride.h"
 
 #include <memory>
 #include <utility>
@@ -16,6 +17,12 @@ namespace {
 
 /// A longer text would leave no room for the others.
 constexpr std::size_t longestText = 200;
+
+/// Discards the lines of decoding, which the display's decoder writes already.
+class DiscardedLog final : public LogOverride {
+public:
+    void write(int, std::string_view) override {}
+};
 
 } // namespace
 
@@ -29,6 +36,7 @@ WatchEvents::WatchEvents(const RuleSet& rules, const Clock& clock, Changed chang
       }) {}
 
 void WatchEvents::setTechnology(std::string_view technology) {
+    const DiscardedLog log;
     const Result<TechnologyFeed*> feed = _feed.of(std::string(technology));
     _technology = feed ? *feed : nullptr;
 }
@@ -40,6 +48,7 @@ void WatchEvents::take(const Data& message) {
     logged.time = _clock.now();
     logged.message = message;
     logged.number = ++_messages;
+    const DiscardedLog log;
     // The display reports what cannot be decoded.
     static_cast<void>(_technology->decode(logged, 0));
 }
