@@ -64,18 +64,20 @@ void BoundExpression::updateDelta(std::size_t index, const InputStore& inputs, W
     if (isKnown && inputs.isTouched(slot) &&
         (samples.empty() || now - samples.back().first >= length / mostInLength))
         samples.emplace_back(now, cells.front().number);
-    while (samples.size() > 1 && samples[1].first <= now - length)
-        samples.pop_front();
     _windowValues[index] = RuleValue::unknown();
     if (samples.empty())
         return;
-    const bool reachesBack = samples.front().first <= now - length;
-    if (isKnown && reachesBack)
+    // The window ends with the latest report: if it went on without reports, it would lose what was reported
+    // first, and its value would be that of an ever shorter time.
+    const Time reported = cells.empty() ? samples.back().first : cells.front().time;
+    const bool isOver = now - reported >= length;
+    const Time start = (isOver ? now : reported) - length;
+    while (samples.size() > 1 && samples[1].first <= start)
+        samples.pop_front();
+    if (isKnown && samples.front().first <= start)
         _windowValues[index] = RuleValue::of(cells.front().number - samples.front().second);
-    if (!reachesBack)
-        wakeup.by(samples.front().first + length);
-    else if (samples.size() > 1)
-        wakeup.by(samples[1].first + length);
+    if (!isOver)
+        wakeup.by(reported + length);
 }
 
 void BoundExpression::updateCount(std::size_t index, const InputStore& inputs, Wakeup& wakeup) {

@@ -40,7 +40,7 @@ TEST(RuleWindowsTest, ChangedComparesWithTheValueBeforeAnUnknownOne) {
     EXPECT_EQ(changed.value(), "true");
 }
 
-TEST(RuleWindowsTest, DeltaComparesWithTheValueAtTheWindowsStart) {
+TEST(RuleWindowsTest, DeltaComparesTheLatestReportWithTheValueAtTheWindowsStart) {
     EvaluatedExpression delta("delta(serving.level, 5 s)");
     delta.set("serving.level", -80);
     EXPECT_EQ(delta.value(), "unknown"); // five seconds ago nothing was known
@@ -49,8 +49,13 @@ TEST(RuleWindowsTest, DeltaComparesWithTheValueAtTheWindowsStart) {
     delta.turn(5).set("serving.level", -90);
     EXPECT_EQ(delta.value(), "-10 dB"); // from -80
     EXPECT_EQ(delta.turn(6.5).value(), "-10 dB");
-    EXPECT_EQ(delta.turn(7).value(), "-5 dB"); // from -85, which was reported five seconds before
+    delta.turn(7).set("serving.level", -92);
+    EXPECT_EQ(delta.value(), "-7 dB"); // from -85, which was reported five seconds before
+    EXPECT_EQ(delta.turn(11.9).value(), "-7 dB");
+    EXPECT_EQ(delta.turn(12).value(), "0 dB"); // no report for five seconds
     EXPECT_EQ(delta.turn(20).value(), "0 dB");
+    delta.turn(21).set("serving.level", -95);
+    EXPECT_EQ(delta.value(), "-3 dB");
 }
 
 TEST(RuleWindowsTest, CountCountsReportsThatFulfilTheCondition) {
