@@ -19,7 +19,7 @@ enum class Masked : std::uint8_t {
     Address,
     Location,
     Position,
-    Time,
+    Times,
     NumberInText,    ///< what looks like a number of a subscriber in a text that should have none
     UnknownCode,     ///< a message of a log code that no decoder of the technology subscribes to
     UnknownKey,      ///< an entry of a property list, SIM files included

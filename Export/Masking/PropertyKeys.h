@@ -38,7 +38,7 @@ enum class PropertyForm : std::uint8_t {
     BaseStation,
     Position,
     ClockTime,
-    Date,
+    DateValue,
 };
 
 struct PropertyKey {

@@ -47,7 +47,7 @@ std::optional<Masked> classOf(PropertyForm form) {
     case BaseStation: return Masked::Location;
     case PropertyForm::Position: return Masked::Position;
     case ClockTime:
-    case PropertyForm::Date: return Masked::Time;
+    case PropertyForm::DateValue: return Masked::Times;
     case Number:
     case Text:
     case Inner:
@@ -149,13 +149,12 @@ bool PropertyListMask::maskValue(Value& value, const Context& context) {
         }
         break;
     case Value::Kind::Date:
-        if (context.form == PropertyForm::Date || !classOf(context.form)) {
+        if (context.form == PropertyForm::DateValue || !classOf(context.form)) {
             if (!_options.masksTimes())
                 return false;
-            const velmora::Date shifted =
-                *value.asDate() - std::chrono::duration_cast<std::chrono::seconds>(_shift);
-            return isPropertyListDate(shifted) ? replace(value, Value(shifted), Masked::Time)
-                                               : remove(value, Masked::Time);
+            const Date shifted = *value.asDate() - std::chrono::duration_cast<std::chrono::seconds>(_shift);
+            return isPropertyListDate(shifted) ? replace(value, Value(shifted), Masked::Times)
+                                               : remove(value, Masked::Times);
         }
         break;
     default: return false; // a flag
@@ -294,7 +293,7 @@ std::optional<std::uint64_t> PropertyListMask::maskedNumber(const Context& conte
 
 bool PropertyListMask::maskInteger(Value& value, const Context& context) {
     const std::optional<Masked> what = classOf(context.form);
-    if (!what || *what == Masked::Time)
+    if (!what || *what == Masked::Times)
         return false;
     const bool isLocation = *what == Masked::Location;
     if (isLocation ? !_options.masksAreas() : !_options.masksIdentities())

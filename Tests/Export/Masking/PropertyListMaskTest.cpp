@@ -192,7 +192,7 @@ TEST_F(PropertyListMaskTest, PositionsAndDatesChangeAtTheLastLevelAlone) {
     EXPECT_EQ(masked(position, PropertyListKind::Modem, MaskLevel::All),
               dictionary({{std::string(kVoxContextStart), Value(Date(std::chrono::hours(24)))}}));
     EXPECT_EQ(_report.of(Masked::Position), 1U);
-    EXPECT_EQ(_report.of(Masked::Time), 2U);
+    EXPECT_EQ(_report.of(Masked::Times), 2U);
 }
 
 TEST_F(PropertyListMaskTest, IdentityOfDigitsMayBeANumber) {
