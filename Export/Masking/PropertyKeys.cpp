@@ -175,7 +175,7 @@ constexpr PropertyKey modemKeys[] = {
     {kVoxContextError, Text},
     {kVoxContextUplinkSpeed, Number},
     {kVoxContextDownlinkSpeed, Number},
-    {kVoxContextStart, DateTime},
+    {kVoxContextStart, DateValue},
     {kVoxContextIPv4, Text},
     {kVoxContextIPv6, Text},
     {kVoxContextMethod, Number},

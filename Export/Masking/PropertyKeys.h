@@ -38,7 +38,7 @@ enum class PropertyForm : std::uint8_t {
     BaseStation,
     Position,
     ClockTime,
-    DateTime,
+    DateValue,
 };
 
 struct PropertyKey {

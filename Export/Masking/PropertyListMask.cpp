@@ -47,7 +47,7 @@ std::optional<Masked> classOf(PropertyForm form) {
     case BaseStation: return Masked::Location;
     case PropertyForm::Position: return Masked::Position;
     case ClockTime:
-    case PropertyForm::DateTime: return Masked::Times;
+    case PropertyForm::DateValue: return Masked::Times;
     case Number:
     case Text:
     case Inner:
@@ -149,11 +149,10 @@ bool PropertyListMask::maskValue(Value& value, const Context& context) {
         }
         break;
     case Value::Kind::Date:
-        if (context.form == PropertyForm::DateTime || !classOf(context.form)) {
+        if (context.form == PropertyForm::DateValue || !classOf(context.form)) {
             if (!_options.masksTimes())
                 return false;
-            const velmora::Date shifted =
-                *value.asDate() - std::chrono::duration_cast<std::chrono::seconds>(_shift);
+            const Date shifted = *value.asDate() - std::chrono::duration_cast<std::chrono::seconds>(_shift);
             return isPropertyListDate(shifted) ? replace(value, Value(shifted), Masked::Times)
                                                : remove(value, Masked::Times);
         }
