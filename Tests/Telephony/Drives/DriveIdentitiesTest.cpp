@@ -14,9 +14,11 @@
 namespace velmora {
 namespace {
 
-using testing::HasSubstr;
 using testing::MatchesRegex;
-using testing::Not;
+
+bool has(const std::string& bytes, const std::string& text) {
+    return bytes.find(text) != std::string::npos;
+}
 
 /// All bytes of a drive's first messages.
 std::string bytesOf(Scenario& scenario) {
@@ -46,29 +48,30 @@ TEST_P(PlantedIdentities, AreThoseOfTheDrive) {
     scenario->setIdentities(identities);
     const std::string bytes = bytesOf(*scenario);
     const std::string name = GetParam();
-    EXPECT_THAT(bytes, HasSubstr(identities.sims[0].iccid));
-    EXPECT_THAT(bytes, HasSubstr(identities.addresses));
-    EXPECT_THAT(bytes, HasSubstr(identities.addresses6));
+    EXPECT_TRUE(has(bytes, identities.sims[0].iccid)) << identities.sims[0].iccid;
+    EXPECT_TRUE(has(bytes, identities.addresses)) << identities.addresses;
+    // A phone of GSM has one context, of the other version.
+    EXPECT_EQ(has(bytes, identities.addresses6), std::string(GetParam()) != "gsm");
     if (name == "modem") {
         for (const std::string& text :
              {identities.sims[1].iccid, identities.sims[0].imsi, identities.sims[1].imsi, identities.eid,
               identities.equipment, withoutSpaces(identities.sims[0].number),
               withoutSpaces(identities.sims[1].number), identities.bearerAddresses,
               identities.bearerAddresses6})
-            EXPECT_THAT(bytes, HasSubstr(text));
+            EXPECT_TRUE(has(bytes, text)) << text;
     } else if (name != "ifx") {
-        EXPECT_THAT(bytes, HasSubstr(identities.sims[0].number));
-        EXPECT_THAT(bytes, HasSubstr(identities.mailbox));
+        EXPECT_TRUE(has(bytes, identities.sims[0].number)) << identities.sims[0].number;
+        EXPECT_TRUE(has(bytes, identities.mailbox)) << identities.mailbox;
     }
     for (const std::string& text : DriveIdentities().texts())
-        EXPECT_THAT(bytes, Not(HasSubstr(text)));
+        EXPECT_FALSE(has(bytes, text)) << text;
 }
 
 TEST_P(PlantedIdentities, AreThoseOfATestNetworkByDefault) {
     const std::string bytes = bytesOf(*drive());
-    EXPECT_THAT(bytes, HasSubstr("8900101000000000017"));
+    EXPECT_TRUE(has(bytes, "8900101000000000017")) << "8900101000000000017";
     for (const std::string& text : identities.texts())
-        EXPECT_THAT(bytes, Not(HasSubstr(text)));
+        EXPECT_FALSE(has(bytes, text)) << text;
 }
 
 TEST(DriveIdentitiesTest, OtherSeedsHaveOtherOnes) {
