@@ -5,6 +5,7 @@
 #include "Tests/Tools/Events/EventsFixture.h"
 
 #include <algorithm>
+#include <filesystem>
 
 namespace velmora {
 namespace {
