@@ -52,11 +52,30 @@ void NeighbourCells::removeReplaced(Time now) {
     const auto isGone = [this, now](const Cell& cell) {
         if (now - cell.neighbour.time > lifetime)
             return true;
+        const bool isOnChannel = _channel && cell.neighbour.channel == _channel;
         if (std::find(_replaced.begin(), _replaced.end(), cell.list) == _replaced.end())
-            return false;
-        return !_channel || !cell.neighbour.channel || *cell.neighbour.channel == *_channel;
+            return isOnChannel && !_replaced.empty(); // by the report of the phone's other mode
+        return !_channel || !cell.neighbour.channel || isOnChannel;
     };
     std::erase_if(_kept, isGone);
+}
+
+/// A cell that several lists have, or one list has twice, is one neighbour: that of the latest report.
+void NeighbourCells::removeRepeated() {
+    const auto identity = [](const Cell& cell) {
+        return std::tie(cell.neighbour.technology, cell.neighbour.channel, cell.neighbour.physicalCell);
+    };
+    // Not std::stable_sort, which allocates.
+    for (std::size_t i = 0; i < _kept.size(); ++i)
+        _kept[i].order = i;
+    std::sort(_kept.begin(), _kept.end(), [&](const Cell& one, const Cell& other) {
+        return std::tuple_cat(identity(one), std::tie(other.order)) <
+               std::tuple_cat(identity(other), std::tie(one.order));
+    });
+    const auto isRepeated = [&](const Cell& one, const Cell& other) {
+        return one.neighbour.channel && one.neighbour.physicalCell && identity(one) == identity(other);
+    };
+    _kept.erase(std::unique(_kept.begin(), _kept.end(), isRepeated), _kept.end());
 }
 
 bool NeighbourCells::endMessage(Time now) {
@@ -74,9 +93,7 @@ bool NeighbourCells::endMessage(Time now) {
             cell.neighbour.channel = _channel;
         _kept.push_back(cell);
     }
-    // Not std::stable_sort, which allocates.
-    for (std::size_t i = 0; i < _kept.size(); ++i)
-        _kept[i].order = i;
+    removeRepeated();
     std::sort(_kept.begin(), _kept.end(), [](const Cell& one, const Cell& other) {
         return std::tie(one.neighbour.level_dBm, other.order) >
                std::tie(other.neighbour.level_dBm, one.order);

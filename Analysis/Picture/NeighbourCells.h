@@ -51,6 +51,7 @@ private:
     };
 
     void removeReplaced(Time now);
+    void removeRepeated();
 
     std::vector<Cell> _kept;
     std::vector<Cell> _new;                      ///< of this message

@@ -171,7 +171,7 @@ TEST(LTENeighbours, AreReplacedCarrierByCarrier) {
 
 TEST(LTENeighbours, WithoutALevelAreLastAndMayBeDetected) {
     LTEEngine lte;
-    lte.measureNeighbours(0, {{21, -110}});
+    lte.measureNeighbours(0, {{21, -110}}, 6300);
     lte.send(lte.at(0.1)
                  .number(connectedEARFCN, 1300)
                  .number(connectedPCI, 17)
@@ -185,6 +185,33 @@ TEST(LTENeighbours, WithoutALevelAreLastAndMayBeDetected) {
     EXPECT_EQ(cells[1].physicalCell, 40);
     EXPECT_EQ(cells[1].channel, 1300);
     EXPECT_TRUE(cells[1].isDetected);
+}
+
+TEST(LTENeighbours, OfACarrierAreThoseOfItsLatestReportInEitherMode) {
+    LTEEngine lte;
+    lte.measureNeighbours(0, {{20, -95}, {21, -80}});
+    lte.measureNeighbours(0.1, {{30, -70}}, 6300);
+    lte.send(lte.at(0.2)
+                 .number(connectedEARFCN, 1300)
+                 .number(connectedPCI, 17)
+                 .list(detectedList, 1)
+                 .row(0)
+                 .number(detectedPCI, 21));
+    const auto cells = lte.picture().neighbours();
+    ASSERT_EQ(cells.size(), 2U);
+    EXPECT_EQ(cells[0].physicalCell, 30);
+    EXPECT_EQ(cells[1].physicalCell, 21);
+    EXPECT_TRUE(cells[1].isDetected);
+}
+
+TEST(LTENeighbours, AreListedOnceWhereAReportHasThemTwice) {
+    LTEEngine lte;
+    lte.measureNeighbours(0, {{20, -95}, {21, -80}, {20, -94}});
+    const auto cells = lte.picture().neighbours();
+    ASSERT_EQ(cells.size(), 2U);
+    EXPECT_EQ(cells[0].physicalCell, 21);
+    EXPECT_EQ(cells[1].physicalCell, 20);
+    EXPECT_EQ(cells[1].level_dBm, -94);
 }
 
 TEST(LTENeighbours, AreForgottenWithTheServingCellAndAfterTenSeconds) {
