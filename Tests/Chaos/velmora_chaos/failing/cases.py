@@ -28,7 +28,7 @@ def all_cases() -> list[Case]:
         Case("info", ["info", str(RECORDINGS / "utran.pcapng")]),
         Case("fields", ["fields", "--format", "json"]),
         Case("stats", ["stats", "--by", "cell", str(RECORDINGS / "lte.pcapng")]),
-        Case("diff of moments", ["diff", str(RECORDINGS / "gsm.pcapng@+60"), str(RECORDINGS / "gsm.pcapng")]),
+        Case("diff of displays", ["diff", "--display", *(str(RECORDINGS / each) for each in ("gsm.pcapng", "lte.pcapng"))]),
         Case("diff of statistics", ["diff", str(RECORDINGS / "c2k.pcapng"), str(RECORDINGS / "lte.pcapng")]),
         ColumnsCase("lte.pcapng"),
         ConvertCase("gsm.pcapng", "drive.pcapng", had=False),
