@@ -15,6 +15,14 @@ namespace {
 
 using Outcome = RuleProgress::Outcome;
 
+/// Whether the operation reads the value of a level or a quality. Other values, such as states, are often
+/// reported only when they change.
+bool readsMeasurement(const ExpressionNode& node) {
+    const bool readsValue = node.operation == ExpressionNode::Operation::Input ||
+                            node.operation == ExpressionNode::Operation::Delta;
+    return readsValue && (node.type.unit == Unit::DBm || node.type.unit == Unit::DB);
+}
+
 RuleValue opposite(const RuleValue& value) {
     return value.isKnown() ? RuleValue::truth(value.isFalse()) : value;
 }
@@ -46,6 +54,9 @@ EventField::Value fieldValue(const RuleValue& value, const Expression& expressio
 RuleState::RuleState(std::shared_ptr<const Rule> rule, InputStore& inputs, std::string technology)
     : _rule(std::move(rule)), _technology(std::move(technology)), _when(_rule->when, inputs),
       _progress(*_rule) {
+    for (const ExpressionNode& each : _rule->when.nodes)
+        if (readsMeasurement(each))
+            _measured.push_back(_when.slots()[each.input]);
     if (_rule->clear)
         _clear.emplace(*_rule->clear, inputs);
     for (const RuleTextPart& each : _rule->textParts)
@@ -71,8 +82,9 @@ Wakeup RuleState::evaluate(const InputStore& inputs, EventSink& sink) {
     const RuleValue ends = !_clear ? opposite(when) : canEnd ? _clear->evaluate(inputs, wakeup) : RuleValue();
     if (_progress.isActive() && when.isTrue() && isTouched(inputs))
         _evidence.add(inputs.message());
+    const bool isConfirmed = isConfirming(inputs);
     for (;;) {
-        const Outcome outcome = _progress.step(inputs.now(), when, ends, wakeup);
+        const Outcome outcome = _progress.step(inputs.now(), when, ends, isConfirmed, wakeup);
         switch (outcome) {
         case Outcome::Nothing: return wakeup;
         case Outcome::Starts:
@@ -148,6 +160,12 @@ std::vector<MessageNumber> RuleState::reporters(const InputStore& inputs) const 
             if (cell.isKnown() && messages.size() < Event::mostEvidence / 2)
                 messages.push_back(cell.message);
     return messages;
+}
+
+bool RuleState::isConfirming(const InputStore& inputs) const {
+    return _measured.empty() ||
+           std::any_of(_measured.begin(), _measured.end(),
+                       [&inputs](std::uint32_t slot) { return inputs.isReported(slot); });
 }
 
 bool RuleState::isTouched(const InputStore& inputs) const {
