@@ -129,11 +129,11 @@ TEST_F(RuleTimingTest, WhatIsNoMeasurementHoldsUntilAnotherReport) {
 }
 
 TEST_F(RuleTimingTest, AnAgeNeedsNoReport) {
-    use("when = \"age(serving.level) >= 3 s\"\nfor = \"5s\"");
+    use("when = \"age(serving.level) >= 1 s\"\nfor = \"3s\"");
     level(0, -111);
-    other(3);
-    other(8);
-    EXPECT_THAT(sink.begun, ElementsAre("weak 3"));
+    other(1);
+    other(4); // the level is known for 5 s
+    EXPECT_THAT(sink.begun, ElementsAre("weak 1"));
 }
 
 TEST_F(RuleTimingTest, AMessageThatEndsTheConditionDoesNotConfirmIt) {
