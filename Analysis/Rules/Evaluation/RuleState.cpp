@@ -7,6 +7,7 @@
 
 #include <algorithm>
 #include <chrono>
+#include <cstddef>
 #include <utility>
 
 namespace velmora {
@@ -15,12 +16,23 @@ namespace {
 
 using Outcome = RuleProgress::Outcome;
 
-/// Whether the operation reads the value of a level or a quality. Other values, such as states, are often
-/// reported only when they change.
-bool readsMeasurement(const ExpressionNode& node) {
-    const bool readsValue = node.operation == ExpressionNode::Operation::Input ||
-                            node.operation == ExpressionNode::Operation::Delta;
-    return readsValue && (node.type.unit == Unit::DBm || node.type.unit == Unit::DB);
+/// The inputs whose levels and qualities the expression reads. Other values, such as states, are often
+/// reported only when they change; and that a value has an age, or is known, is no measurement.
+std::vector<std::uint32_t> measuredInputs(const Expression& expression) {
+    using Operation = ExpressionNode::Operation;
+    std::vector<std::uint32_t> inputs;
+    for (std::size_t i = 0; i < expression.nodes.size(); ++i) {
+        const ExpressionNode& node = expression.nodes[i];
+        const auto readsNoValue = [i](const ExpressionNode& other) {
+            return (other.operation == Operation::Age || other.operation == Operation::Known) &&
+                   other.first == i;
+        };
+        const bool readsValue = node.operation == Operation::Input &&
+                                std::none_of(expression.nodes.begin(), expression.nodes.end(), readsNoValue);
+        if (readsValue && (node.type.unit == Unit::DBm || node.type.unit == Unit::DB))
+            inputs.push_back(node.input);
+    }
+    return inputs;
 }
 
 RuleValue opposite(const RuleValue& value) {
@@ -54,9 +66,8 @@ EventField::Value fieldValue(const RuleValue& value, const Expression& expressio
 RuleState::RuleState(std::shared_ptr<const Rule> rule, InputStore& inputs, std::string technology)
     : _rule(std::move(rule)), _technology(std::move(technology)), _when(_rule->when, inputs),
       _progress(*_rule) {
-    for (const ExpressionNode& each : _rule->when.nodes)
-        if (readsMeasurement(each))
-            _measured.push_back(_when.slots()[each.input]);
+    for (const std::uint32_t each : measuredInputs(_rule->when))
+        _measured.push_back(_when.slots()[each]);
     if (_rule->clear)
         _clear.emplace(*_rule->clear, inputs);
     for (const RuleTextPart& each : _rule->textParts)
