@@ -68,6 +68,17 @@ void InputStore::remove(std::uint32_t slot) {
         cell.kind = ObservedKind::Absent;
 }
 
+bool InputStore::isReported(std::uint32_t slot) const {
+    if (!isTouched(slot))
+        return false;
+    const Slot& values = _slots[slot];
+    if (values.input.isNeighbour()) // touched where one has become too old, too
+        return std::any_of(_neighbours.begin(), _neighbours.end(),
+                           [this](const Neighbour& each) { return each.time == _now; });
+    return std::any_of(values.cells.begin(), values.cells.end(),
+                       [this](const InputCell& each) { return each.isKnown() && each.turn == _turn; });
+}
+
 void InputStore::setNeighbours(std::span<const Neighbour> neighbours) {
     _neighbours.assign(neighbours.begin(), neighbours.end());
     for (std::uint32_t i = 0; i < _slots.size(); ++i) {

@@ -60,6 +60,8 @@ public:
     /// The slots that were reported or removed in this turn, each once.
     [[nodiscard]] std::span<const std::uint32_t> touched() const { return _touched; }
     [[nodiscard]] bool isTouched(std::uint32_t slot) const { return _slots[slot].turn == _turn; }
+    /// Whether the message of this turn reports a value of the slot, in any row or for any neighbour.
+    [[nodiscard]] bool isReported(std::uint32_t slot) const;
 
     /// Sets the value of an input, of that row of a list. Rows beyond `mostRows` are dropped.
     void set(std::uint32_t slot, const ReportedValue& value, std::span<const std::uint32_t> rows = {});

@@ -6,13 +6,14 @@
 namespace velmora {
 
 RuleProgress::Outcome RuleProgress::step(Time now, const RuleValue& when, const RuleValue& ends,
-                                         Wakeup& wakeup) {
-    return _isActive ? stepActive(now, ends, wakeup) : stepIdle(now, when, ends, wakeup);
+                                         bool isConfirming, Wakeup& wakeup) {
+    return _isActive ? stepActive(now, ends, wakeup) : stepIdle(now, when, ends, isConfirming, wakeup);
 }
 
 void RuleProgress::reset() {
     _isActive = false;
     _begin.reset();
+    _isConfirmed = false;
     _end.reset();
     _unknown.reset();
 }
@@ -31,7 +32,7 @@ bool RuleProgress::isLost(Time now, bool isKnown, Wakeup& wakeup) {
 }
 
 RuleProgress::Outcome RuleProgress::stepIdle(Time now, const RuleValue& when, const RuleValue& ends,
-                                             Wakeup& wakeup) {
+                                             bool isConfirming, Wakeup& wakeup) {
     // An event that would end as it begins does not begin.
     if (when.isFalse() || ends.isTrue()) {
         reset();
@@ -45,10 +46,15 @@ RuleProgress::Outcome RuleProgress::stepIdle(Time now, const RuleValue& when, co
         _begin = now;
         return Outcome::Starts;
     }
+    if (isConfirming && now > *_begin)
+        _isConfirmed = true;
     if (now - *_begin < _rule.holdFor) {
         wakeup.by(*_begin + _rule.holdFor);
         return Outcome::Nothing;
     }
+    // One measurement, which stays known for some seconds, does not show what lasts.
+    if (!_isConfirmed && _rule.holdFor > Time::duration::zero())
+        return Outcome::Nothing; // until a report
     _isActive = true;
     _end.reset();
     return Outcome::Begins;

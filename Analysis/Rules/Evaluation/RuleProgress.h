@@ -27,9 +27,10 @@ public:
     /// The rule must outlive it.
     explicit RuleProgress(const Rule& rule) : _rule(rule) {}
 
-    /// The condition and what ends the event, at that time. To be called again while it does not return
-    /// `Nothing`.
-    [[nodiscard]] Outcome step(Time now, const RuleValue& when, const RuleValue& ends, Wakeup& wakeup);
+    /// The condition and what ends the event, at that time. `isConfirming`: the message reports what the
+    /// condition was measured by. To be called again while it does not return `Nothing`.
+    [[nodiscard]] Outcome step(Time now, const RuleValue& when, const RuleValue& ends, bool isConfirming,
+                               Wakeup& wakeup);
     /// Starts from the beginning.
     void reset();
 
@@ -41,7 +42,8 @@ public:
     [[nodiscard]] std::optional<Time> end() const { return _end; }
 
 private:
-    [[nodiscard]] Outcome stepIdle(Time now, const RuleValue& when, const RuleValue& ends, Wakeup& wakeup);
+    [[nodiscard]] Outcome stepIdle(Time now, const RuleValue& when, const RuleValue& ends, bool isConfirming,
+                                   Wakeup& wakeup);
     [[nodiscard]] Outcome stepActive(Time now, const RuleValue& ends, Wakeup& wakeup);
     /// Whether it has been unknown for too long.
     [[nodiscard]] bool isLost(Time now, bool isKnown, Wakeup& wakeup);
@@ -49,6 +51,7 @@ private:
     const Rule& _rule;
     bool _isActive = false;
     std::optional<Time> _begin;   ///< since when `when` has held
+    bool _isConfirmed = false;    ///< by a report after `_begin`
     std::optional<Time> _end;     ///< since when what ends the event has held
     std::optional<Time> _unknown; ///< since when the condition has been unknown
 };

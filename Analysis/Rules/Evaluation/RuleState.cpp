@@ -7,6 +7,7 @@
 
 #include <algorithm>
 #include <chrono>
+#include <cstddef>
 #include <utility>
 
 namespace velmora {
@@ -14,6 +15,25 @@ namespace velmora {
 namespace {
 
 using Outcome = RuleProgress::Outcome;
+
+/// The inputs whose levels and qualities the expression reads. Other values, such as states, are often
+/// reported only when they change; and that a value has an age, or is known, is no measurement.
+std::vector<std::uint32_t> measuredInputs(const Expression& expression) {
+    using Operation = ExpressionNode::Operation;
+    std::vector<std::uint32_t> inputs;
+    for (std::size_t i = 0; i < expression.nodes.size(); ++i) {
+        const ExpressionNode& node = expression.nodes[i];
+        const auto readsNoValue = [i](const ExpressionNode& other) {
+            return (other.operation == Operation::Age || other.operation == Operation::Known) &&
+                   other.first == i;
+        };
+        const bool readsValue = node.operation == Operation::Input &&
+                                std::none_of(expression.nodes.begin(), expression.nodes.end(), readsNoValue);
+        if (readsValue && (node.type.unit == Unit::DBm || node.type.unit == Unit::DB))
+            inputs.push_back(node.input);
+    }
+    return inputs;
+}
 
 RuleValue opposite(const RuleValue& value) {
     return value.isKnown() ? RuleValue::truth(value.isFalse()) : value;
@@ -46,6 +66,8 @@ EventField::Value fieldValue(const RuleValue& value, const Expression& expressio
 RuleState::RuleState(std::shared_ptr<const Rule> rule, InputStore& inputs, std::string technology)
     : _rule(std::move(rule)), _technology(std::move(technology)), _when(_rule->when, inputs),
       _progress(*_rule) {
+    for (const std::uint32_t each : measuredInputs(_rule->when))
+        _measured.push_back(_when.slots()[each]);
     if (_rule->clear)
         _clear.emplace(*_rule->clear, inputs);
     for (const RuleTextPart& each : _rule->textParts)
@@ -71,8 +93,9 @@ Wakeup RuleState::evaluate(const InputStore& inputs, EventSink& sink) {
     const RuleValue ends = !_clear ? opposite(when) : canEnd ? _clear->evaluate(inputs, wakeup) : RuleValue();
     if (_progress.isActive() && when.isTrue() && isTouched(inputs))
         _evidence.add(inputs.message());
+    const bool isConfirmed = isConfirming(inputs);
     for (;;) {
-        const Outcome outcome = _progress.step(inputs.now(), when, ends, wakeup);
+        const Outcome outcome = _progress.step(inputs.now(), when, ends, isConfirmed, wakeup);
         switch (outcome) {
         case Outcome::Nothing: return wakeup;
         case Outcome::Starts:
@@ -148,6 +171,12 @@ std::vector<MessageNumber> RuleState::reporters(const InputStore& inputs) const 
             if (cell.isKnown() && messages.size() < Event::mostEvidence / 2)
                 messages.push_back(cell.message);
     return messages;
+}
+
+bool RuleState::isConfirming(const InputStore& inputs) const {
+    return _measured.empty() ||
+           std::any_of(_measured.begin(), _measured.end(),
+                       [&inputs](std::uint32_t slot) { return inputs.isReported(slot); });
 }
 
 bool RuleState::isTouched(const InputStore& inputs) const {

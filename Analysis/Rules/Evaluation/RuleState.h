@@ -40,10 +40,13 @@ private:
     /// The messages that reported what the condition reads.
     [[nodiscard]] std::vector<MessageNumber> reporters(const InputStore& inputs) const;
     [[nodiscard]] bool isTouched(const InputStore& inputs) const;
+    /// Whether the message reports a level or a quality that `when` reads, or `when` reads none.
+    [[nodiscard]] bool isConfirming(const InputStore& inputs) const;
 
     std::shared_ptr<const Rule> _rule;
     std::string _technology;
     BoundExpression _when;
+    std::vector<std::uint32_t> _measured; ///< slots of levels and qualities that `_when` reads
     std::optional<BoundExpression> _clear;
     std::vector<BoundExpression> _texts; ///< of the text's parts that are values
     RuleProgress _progress;

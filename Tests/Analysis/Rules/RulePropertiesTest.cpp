@@ -180,6 +180,7 @@ public:
         for (const auto& [time, level] : levels)
             RC_ASSERT(time < event.time || level < -110);
         RC_ASSERT(levels.contains(event.time));
+        RC_ASSERT(levels.upper_bound(event.time) != levels.end()); // a second measurement
     }
     void happened(const Event&) override {}
 

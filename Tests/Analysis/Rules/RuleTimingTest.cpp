@@ -70,6 +70,7 @@ TEST_F(RuleTimingTest, AnEventLastsWhileTheConditionHolds) {
 TEST_F(RuleTimingTest, ForDelaysTheReportAndNotTheBegin) {
     use("when = \"serving.level < -110\"\nfor = \"5s\"");
     level(1, -111);
+    level(2, -112);
     other(5.9);
     EXPECT_THAT(sink.begun, IsEmpty());
     other(6);
@@ -87,6 +88,52 @@ TEST_F(RuleTimingTest, ForStartsAgainWhenTheConditionFails) {
     EXPECT_THAT(sink.begun, IsEmpty());
     level(9.5, -111);
     EXPECT_THAT(sink.begun, ElementsAre("weak 4.5"));
+}
+
+TEST_F(RuleTimingTest, ForNeedsASecondMeasurement) {
+    use("when = \"serving.level < -110\"\nfor = \"5s\"");
+    level(1, -111);
+    level(1, -112); // at the same time
+    other(6);
+    other(7);
+    EXPECT_THAT(sink.begun, IsEmpty());
+    level(8, -111);
+    EXPECT_THAT(sink.begun, ElementsAre("weak 1"));
+}
+
+TEST_F(RuleTimingTest, TheMeasurementBeforeAFailureDoesNotCountForTheNextTime) {
+    use("when = \"serving.level < -110\"\nfor = \"5s\"");
+    level(0, -111);
+    level(1, -111);
+    level(2, -100);
+    level(3, -111);
+    other(8);
+    EXPECT_THAT(sink.begun, IsEmpty());
+}
+
+TEST_F(RuleTimingTest, AValueThatIsGoneIsNoMeasurement) {
+    use("when = \"serving.level < -110\"\nfor = \"5s\"");
+    level(0, -111);
+    level(1, std::nullopt);
+    other(5);
+    level(9, -100);
+    end();
+    EXPECT_THAT(sink.begun, IsEmpty());
+}
+
+TEST_F(RuleTimingTest, WhatIsNoMeasurementHoldsUntilAnotherReport) {
+    use("when = \"serving.channel == 6300\"\nfor = \"5s\"");
+    level(0, 6300);
+    other(5);
+    EXPECT_THAT(sink.begun, ElementsAre("weak 0"));
+}
+
+TEST_F(RuleTimingTest, AnAgeNeedsNoReport) {
+    use("when = \"age(serving.level) >= 1 s\"\nfor = \"3s\"");
+    level(0, -111);
+    other(1);
+    other(4); // the level is known for 5 s
+    EXPECT_THAT(sink.begun, ElementsAre("weak 1"));
 }
 
 TEST_F(RuleTimingTest, AMessageThatEndsTheConditionDoesNotConfirmIt) {
@@ -200,6 +247,7 @@ TEST_F(RuleTimingTest, ATimeThatGoesBackALittleCountsAsTheLatest) {
     use("when = \"serving.level < -110\"\nfor = 5");
     level(5, -111);
     level(4.5, -111);
+    level(5.5, -111);
     other(9.9);
     EXPECT_THAT(sink.begun, IsEmpty());
     other(10);
