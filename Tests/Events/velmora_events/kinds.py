@@ -58,12 +58,9 @@ KINDS = {
 }
 
 SHOWN_ONLY = {
-    ("cell-change", "lte"): "a record of zeros during a search hides that there is no cell",
     ("poor-quality", "lte"): "the last measurement before a power-off counts for as long as the cell is known",
     ("pilot-pollution", "gsm"): "the levels of serving cell and neighbours are of different times and rounded differently",
-    ("pilot-pollution", "lte"): "a cell in the lists of both modes counts twice",
-    ("pilot-pollution", "modem"): "a cell that is listed twice counts twice",
-    ("block-error-burst", "gsm"): "the five seconds move on after the last block",
+    ("pilot-pollution", "lte"): "the levels of serving cell and neighbours are of different times",
 }
 """Where a kind is short in a scenario, and why: the figures are shown, and nothing is asked of them."""
 
