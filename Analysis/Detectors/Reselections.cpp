@@ -113,7 +113,7 @@ void ReselectionsDetector::judge(const MessageReport& report, const RadioPicture
         Event event =
             newEvent(isLate ? EventKind::LateReselection : EventKind::EarlyReselection, report, picture);
         std::array<char, 64> margin{};
-        std::snprintf(margin.data(), margin.size(), "%.1f dB", std::abs(each.margin_dB));
+        std::snprintf(margin.data(), margin.size(), "%.1f dB", std::fabs(each.margin_dB));
         event.text = nameOf(change.from) + " to " + nameOf(change.to) + ", " + margin.data() +
                      (each.margin_dB > 0 ? " stronger" : " weaker");
         addField(event, "from", change.from);

@@ -27,7 +27,7 @@ public:
     };
 
     /// `mask` may be null, for messages as they are; it must outlive the model.
-    WatchModel(ModelPlatform platform, ModelObserver* observer, DecoderLines& lines, Events events,
+    WatchModel(const ModelPlatform& platform, ModelObserver* observer, DecoderLines& lines, Events events,
                MessageMask* mask = nullptr)
         : VelmoraModel(platform, observer), _clock(platform.clock), _lines(lines), _events(std::move(events)),
           _mask(mask) {}
