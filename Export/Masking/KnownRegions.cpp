@@ -14,13 +14,13 @@ using enum KnownRegion::Kind;
 /// In ascending order of code.
 constexpr KnownRegion regions[] = {
     {0x108A, Fixed, 22, 1},
-    {0x108A, List, 23, 14, 14, u8At(22)},
+    {0x108A, WholeList, 23, 8, 14, u8At(22)},
     {0x1192, Fixed, 13, 4 + 4 * 56},
     {0x119C, SubPackets, 14, 1 << 1 | 1 << 2 | 1 << 3},
     {0x119D, SubPackets, 14, 1 << 11},
     {0x127E, Fixed, 14, 1750 - 14},
     {0x12B6, Fixed, 15, 1},
-    {0x12B6, List, 25, 12, 12, u8At(15)},
+    {0x12B6, WholeList, 25, 4, 12, u8At(15)},
     {0x134F, Fixed, 13, 1},
     {0x134F, Fixed, 46, 4},
     {0x4005, Fixed, 13, 2},

@@ -18,6 +18,7 @@ struct KnownRegion {
     enum class Kind : std::uint8_t {
         Fixed,      ///< `first` to `first + length`
         List,       ///< entries of `length` bytes, `stride` apart, from `first` on
+        WholeList,  ///< a list of which nothing is read where the record ends within it
         SubPackets, ///< of CDMA2000: those of the ids in the bits of `length`, and the headers of the others
     };
 

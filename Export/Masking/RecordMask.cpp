@@ -86,7 +86,11 @@ void addList(std::vector<std::uint8_t>& known, const KnownRegion& list,
              std::span<const std::uint8_t> record) {
     const std::size_t first = list.first + list.movedBy * countAt(list.moved, record);
     const std::size_t count = countAt(list.count, record) + list.countOffset;
-    for (std::size_t i = 0, at = first; i < count && at < record.size(); ++i, at += list.stride)
+    if (list.kind == KnownRegion::Kind::WholeList && first + count * list.stride > record.size())
+        return;
+    // Of an entry that the record ends within, nothing is read.
+    for (std::size_t i = 0, at = first; i < count && at + list.stride <= record.size();
+         ++i, at += list.stride)
         setKnown(known, at, list.length);
 }
 
@@ -220,7 +224,8 @@ bool RecordMask::clearUnknown(const RecordLayout& layout, std::span<std::uint8_t
     for (const KnownRegion& region : layout.regions) {
         switch (region.kind) {
         case KnownRegion::Kind::Fixed: setKnown(_known, region.first, region.length); break;
-        case KnownRegion::Kind::List: addList(_known, region, record); break;
+        case KnownRegion::Kind::List:
+        case KnownRegion::Kind::WholeList: addList(_known, region, record); break;
         case KnownRegion::Kind::SubPackets: addSubPackets(_known, region, record); break;
         }
     }

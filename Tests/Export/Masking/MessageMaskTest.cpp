@@ -70,6 +70,24 @@ TEST_F(MessageMaskTest, TemporaryIdentityIsMasked) {
     EXPECT_EQ(_report.of(Masked::Subscriber), 1U);
 }
 
+TEST_F(MessageMaskTest, ListThatTheRecordEndsWithinIsRemoved) {
+    const Data message = record(0x12B6, "00 00 "                      // 13
+                                        "02 "                         // two pilots, of which one is there
+                                        "00 00 00 00 00 00 00 00 00 " // of which no field is read
+                                        "38 39 34 39 30 32 30 30 30 30 30 31 "
+                                        "39 30");
+    EXPECT_EQ(masked(message, "Ostrel_CDMA"), record(0x12B6, "00 00 02 00 00 00 00 00 00 00 00 00 "
+                                                             "00 00 00 00 00 00 00 00 00 00 00 00 00 00"));
+    EXPECT_EQ(_report.of(Masked::UnknownBytes), 14U);
+}
+
+TEST_F(MessageMaskTest, EntryThatTheRecordEndsWithinIsRemoved) {
+    const Data message = record(0x51FF, "00 02 "       // two BSICs
+                                        "28 00 0B 00 " // ARFCN 40
+                                        "39 30 31");
+    EXPECT_EQ(masked(message, "Ostrel_GSM"), record(0x51FF, "00 02 28 00 0B 00 00 00 00"));
+}
+
 TEST_F(MessageMaskTest, CellsOfRecordsAndListsHaveTheSamePseudonyms) {
     std::vector<std::uint8_t> payload(25);
     payload[9] = 0x03; // cell identity 0x1234503, at 22

@@ -1,6 +1,8 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
+#include "LogMessages/LogMessage.h"
+#include "LogMessages/RecordTime.h"
 #include "Tests/Tools/Mask/MaskFixture.h"
 
 #include <gmock/gmock.h>
@@ -17,6 +19,13 @@ using testing::Not;
 
 class MaskFormsTest : public MaskTest {
 protected:
+    [[nodiscard]] static Data stamped(const Data& message, Time time) {
+        std::vector<std::uint8_t> bytes(message.bytes().begin(), message.bytes().end());
+        for (std::size_t i = 0; i < 8; ++i)
+            bytes[LogMessage::timestampOffset + i] =
+                static_cast<std::uint8_t>(recordTimestamp(time) >> (8 * i));
+        return Data(std::move(bytes));
+    }
     void convert(const std::string& in, const std::string& out) {
         ToolProcess process(tool({"convert", path(in), path(out)}));
         EXPECT_EQ(process.exitStatus(), 0) << process.errors();
@@ -57,6 +66,22 @@ TEST_F(MaskFormsTest, LogIsMaskedAndSealed) {
     content.back() = static_cast<char>(content.back() ^ 1);
     std::ofstream(path("changed.dlf"), std::ios::binary) << content;
     static_cast<void>(mask({"--check", "--technology", "GSM", path("changed.dlf")}, 1));
+}
+
+TEST_F(MaskFormsTest, LogHasNoRecordThatItsReaderWouldNotFind) {
+    std::vector<TimedMessage> drive = {{at(0), rrState(4)}, {at(500), rrState(5)}, {at(4100), rrState(4)}};
+    for (TimedMessage& each : drive)
+        each.message = stamped(each.message, each.time);
+    // Of an unknown code and without a time: masked, it is zeros but for its length and code.
+    drive.insert(drive.begin() + 2, {at(1000), record(0x1375, "38 39 30 30 30 30 30 31 32 33")});
+    drive.insert(drive.begin() + 3, {at(2000), stamped(record(0x1375, "38 39 30 30"), at(2000))});
+    writeRecording("zeros.pcapng", "Ostrel_GSM", drive);
+    static_cast<void>(mask({path("zeros.pcapng"), path("out/a.pcapng")}));
+    EXPECT_EQ(messagesOf("out/a.pcapng").size(), 5U);
+    const Outcome outcome = mask({"--report", path("zeros.pcapng"), path("out/a.dlf")});
+    EXPECT_THAT(outcome.output + outcome.messages, HasSubstr("5 messages, 2 changed, 1 left out"));
+    EXPECT_EQ(messagesOf("out/a.dlf").size(), 4U);
+    static_cast<void>(mask({"--check", "--technology", "GSM", path("out/a.dlf")}));
 }
 
 TEST_F(MaskFormsTest, GzippedFilesAreRead) {
