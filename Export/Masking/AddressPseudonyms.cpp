@@ -59,7 +59,9 @@ Version4 AddressPseudonyms::version4(const Version4& address) const {
     if (isUnspecified(address))
         return address;
     const KeyedHash::Digest digest = _hash(messageOf(address));
-    const unsigned number = (digest[0] << 16 | digest[1] << 8 | digest[2]) % (3 * hostsOfNetwork);
+    const unsigned high = digest[0];
+    const unsigned middle = digest[1];
+    const unsigned number = (high << 16 | middle << 8 | digest[2]) % (3 * hostsOfNetwork);
     const auto& network = documentNetworks[number / hostsOfNetwork];
     return {network[0], network[1], network[2], static_cast<std::uint8_t>(1 + number % hostsOfNetwork)};
 }

@@ -66,8 +66,10 @@ static_assert(std::ranges::is_sorted(regions, {}, &KnownRegion::code));
 } // namespace
 
 std::span<const KnownRegion> knownRegionsOf(std::uint32_t code) {
-    const auto found = std::ranges::equal_range(regions, code, {}, &KnownRegion::code);
-    return {found.begin(), found.end()};
+    // No std::ranges::equal_range: clang 14 refuses the range that libstdc++ returns.
+    const auto* const begin = std::ranges::lower_bound(regions, code, {}, &KnownRegion::code);
+    const auto* const end = std::ranges::upper_bound(regions, code, {}, &KnownRegion::code);
+    return {begin, end};
 }
 
 } // namespace velmora

@@ -87,13 +87,13 @@ std::vector<EncodedValue> encodingsOf(std::string_view value) {
             digits += c;
     const bool isNumber = !digits.empty() && digits.find_first_not_of("0123456789") == std::string::npos;
     std::vector<EncodedValue> plain;
-    for (const std::string_view text : {value, std::string_view(isNumber ? digits : std::string())}) {
+    for (const std::string_view text : {value, isNumber ? std::string_view(digits) : std::string_view()}) {
         add(plain, ValueEncoding::Text, bytesOf(text));
         add(plain, ValueEncoding::UTF16Little, utf16(text, false));
         add(plain, ValueEncoding::UTF16Big, utf16(text, true));
     }
     if (isNumber)
-        for (const std::size_t offset : {0, 1})
+        for (const std::size_t offset : {std::size_t{0}, std::size_t{1}})
             for (const bool isSwapped : {false, true})
                 add(plain, isSwapped ? ValueEncoding::SwappedBCD : ValueEncoding::BCD,
                     packed(digits, offset, isSwapped));
@@ -104,7 +104,7 @@ std::vector<EncodedValue> encodingsOf(std::string_view value) {
             for (const char* const each : {"0123456789abcdef", "0123456789ABCDEF"})
                 add(all, isText ? ValueEncoding::Hexadecimal : ValueEncoding::SwappedText,
                     hexadecimal(bytes, each));
-        for (const std::size_t before : {0, 1, 2})
+        for (const std::size_t before : {std::size_t{0}, std::size_t{1}, std::size_t{2}})
             add(all, ValueEncoding::Base64, base64(bytes, before));
     }
     return all;
