@@ -159,6 +159,7 @@ TEST(RuleFileTest, MistakesOfTOMLAreAtTheirPlace) {
     EXPECT_THAT(mistakesIn("[[rule]]\nname = weak\n"), ElementsAre(HasSubstr("my.toml:2:8: ")));
     EXPECT_THAT(mistakesIn("a = \"\xFF\"\n"), ElementsAre(HasSubstr("my.toml:1:")));
     // Assertions of the parser do not hold for this one.
+    EXPECT_THAT(mistakesIn("[[rD\u0459[\n"), testing::SizeIs(1));
     EXPECT_THAT(mistakesIn("[[#\n"), ElementsAre("my.toml: got a text that is no TOML document"));
     EXPECT_THAT(mistakesIn("rule = 3\n"), ElementsAre("my.toml:1:8: got a number for rule, wanted an array"));
     EXPECT_THAT(mistakesIn("rule = [3]\n"), ElementsAre("my.toml:1:9: got a number, wanted [[rule]] tables"));
