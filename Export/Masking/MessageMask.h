@@ -22,7 +22,7 @@
 namespace velmora {
 
 /// Masks log messages. The same values become the same pseudonyms in all messages that are masked with a key.
-/// What is not known to identify nobody is removed: bytes become 0, entries of property lists disappear. A
+/// What is not known to be harmless is removed: bytes become 0, entries of property lists disappear. A
 /// message keeps its length, but for property lists whose values become longer or shorter. Main thread only.
 class MessageMask {
 public:

@@ -22,7 +22,7 @@ using enum PropertyForm;
 /// become one of a single entry, which is shown otherwise.
 constexpr std::string_view removedText = "(removed)";
 
-/// Whom the value identifies; absent where it identifies nobody.
+/// Whom the value identifies; absent where it is no identity.
 std::optional<Masked> classOf(PropertyForm form) {
     switch (form) {
     case ICCID:

@@ -18,7 +18,7 @@ namespace velmora {
 struct MaskOptions {
     MaskKey key;
     MaskLevel level = MaskLevel::Identity;
-    bool keepsUnknown = false; ///< what is not known to identify nobody stays too
+    bool keepsUnknown = false; ///< what is not known to be harmless stays too
     /// The level at which the messages have been masked with the same key already: that is not done again.
     std::optional<MaskLevel> done = std::nullopt;
 

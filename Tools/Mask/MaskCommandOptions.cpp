@@ -44,7 +44,7 @@ CLI::App* addMask(CLI::App& app, MaskCommandOptions& options) {
     addTechnology(*command, options.technology, "Mask as");
     CLI::Option* keep = command->add_flag(
         "--keep-unknown", options.keepsUnknown,
-        "Keep what is not known to identify nobody: messages of unknown codes, SIM files, keys and bytes");
+        "Keep what is not known to be harmless: messages of unknown codes, SIM files, keys and bytes");
     CLI::Option* report = command->add_flag("--report", options.reports,
                                             "Print what was masked and removed, by class and count");
     CLI::Option* force = command->add_flag("--force", options.force, "Overwrite OUT if it exists");
@@ -77,7 +77,7 @@ CLI::App* addMask(CLI::App& app, MaskCommandOptions& options) {
     });
     command->footer(
         "Masked are the numbers of subscriber, SIM and phone, phone numbers, addresses and temporary\n"
-        "identities; what is not known to identify nobody is removed, and so are descriptions, comments and\n"
+        "identities; what is not known to be harmless is removed, and so are descriptions, comments and\n"
         "blocks of other programs. Pseudonyms have the form of what they stand for.\n\n"
         "Not hidden: level identity does not hide where the phone was; neighbour lists, channels and levels\n"
         "identify places at every level; level location keeps positions, if a message has them; times can\n"

@@ -21,7 +21,7 @@
 namespace velmora {
 namespace {
 
-/// The first leaf that differs although it identifies nobody; empty where there is none.
+/// The first leaf that differs although it is no identity; empty where there is none.
 std::string unexpectedDifference(const Value& a, const Value& b, const CatalogueNode* node, MaskLevel level) {
     const auto below = [&](const char* name) { return node ? node->find(name) : nullptr; };
     if (a.asDictionary() && b.asDictionary()) {

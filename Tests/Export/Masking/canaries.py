@@ -7,7 +7,7 @@ usage: canaries.py VELMORA_LOG MAKE_DRIVE [--seeds N] [--first N] [--scenario NA
 
 Shares nothing with the masked program: it reads and writes the blocks of a recording, property lists and encodings by
 itself. Planted are the identities that SIM files, contexts, displays and a live modem's messages have, under the keys
-of these and under keys that nobody knows; in records of unknown codes, behind the end of known ones and in bytes that no
+of these and under unknown keys; in records of unknown codes, behind the end of known ones and in bytes that no
 field is read from; in malformed messages; and in comments, options, host names and unknown blocks of the recording.
 Each is searched for in eight encodings. Exit status: 0 nothing found, 1 something found or a command failed, 2 usage.
 """
