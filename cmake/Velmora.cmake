@@ -104,6 +104,9 @@ function(velmora_test name)
     target_compile_definitions(${name} PRIVATE VELMORA_SOURCE_DIR="${PROJECT_SOURCE_DIR}"
                                VELMORA_BUILD_DIR="${CMAKE_BINARY_DIR}")
     velmora_compile_quickly(${name})
+    if(VELMORA_PRECOMPILED_HEADERS)
+        target_precompile_headers(${name} REUSE_FROM test-headers)
+    endif()
     if(arg_NEEDS)
         add_dependencies(${name} ${arg_NEEDS})
     endif()
@@ -148,10 +151,11 @@ endfunction()
 # that each header is known to compile alone.
 function(velmora_header_check)
     file(GLOB_RECURSE headers CONFIGURE_DEPENDS RELATIVE ${PROJECT_SOURCE_DIR}
-         ${PROJECT_SOURCE_DIR}/App/*.h ${PROJECT_SOURCE_DIR}/Fuzz/*.h ${PROJECT_SOURCE_DIR}/LogGenerator/*.h
-         ${PROJECT_SOURCE_DIR}/LogMessages/*.h ${PROJECT_SOURCE_DIR}/Model/*.h
-         ${PROJECT_SOURCE_DIR}/Platform/*.h ${PROJECT_SOURCE_DIR}/PropertyLists/*.h ${PROJECT_SOURCE_DIR}/Recording/*.h ${PROJECT_SOURCE_DIR}/Telephony/*.h
-         ${PROJECT_SOURCE_DIR}/Tests/*.h ${PROJECT_SOURCE_DIR}/Toolkit/*.h ${PROJECT_SOURCE_DIR}/Tools/*.h)
+         ${PROJECT_SOURCE_DIR}/Analysis/*.h ${PROJECT_SOURCE_DIR}/App/*.h ${PROJECT_SOURCE_DIR}/Export/*.h
+         ${PROJECT_SOURCE_DIR}/Fuzz/*.h ${PROJECT_SOURCE_DIR}/LogGenerator/*.h ${PROJECT_SOURCE_DIR}/LogMessages/*.h
+         ${PROJECT_SOURCE_DIR}/Model/*.h ${PROJECT_SOURCE_DIR}/Platform/*.h ${PROJECT_SOURCE_DIR}/PropertyLists/*.h
+         ${PROJECT_SOURCE_DIR}/Recording/*.h ${PROJECT_SOURCE_DIR}/Telephony/*.h ${PROJECT_SOURCE_DIR}/Tests/*.h
+         ${PROJECT_SOURCE_DIR}/Toolkit/*.h ${PROJECT_SOURCE_DIR}/Tools/*.h)
     set(sources)
     foreach(header IN LISTS headers)
         string(REGEX REPLACE "\\.h$" ".cpp" source ${header})
