@@ -56,6 +56,18 @@ void Button::setEnabled(bool isEnabled) {
     _button->setEnabled(isEnabled);
 }
 
+void Button::setTogglable(bool isTogglable) {
+    _button->setCheckable(isTogglable);
+}
+
+bool Button::isOn() const {
+    return _button->isChecked();
+}
+
+void Button::setOn(bool isOn) {
+    _button->setChecked(isOn);
+}
+
 void Button::press() {
     _button->click();
 }

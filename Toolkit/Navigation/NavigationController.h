@@ -7,7 +7,9 @@
 #include "Toolkit/Navigation/ViewController.h"
 #include "Toolkit/Notice.h"
 
+#include <functional>
 #include <memory>
+#include <string>
 #include <vector>
 
 namespace velmora {
@@ -51,6 +53,14 @@ public:
     void setNotice(Notice notice);
     [[nodiscard]] const Notice& notice() const { return _notice; }
 
+    /// A button in the header of every pane; none at first, and for an empty title.
+    void setHeaderCommand(std::string title, std::function<void()> action);
+    /// What the back button leads to from the root pane, and how; without a title there is none. Escape and
+    /// the like do the same.
+    void setLeave(std::string title, std::function<void()> action);
+    /// Whether the top pane's title is also the window's; it is at first.
+    void setNamesWindow(bool namesWindow) { _namesWindow = namesWindow; }
+
     void viewWillAppear(bool animated) override;
     void viewDidAppear(bool animated) override;
     void viewWillDisappear(bool animated) override;
@@ -77,7 +87,18 @@ private:
 
     std::vector<std::shared_ptr<ViewController>> _panes;
     NavigationControllerDelegate* _delegate = nullptr;
+    /// A title and what it does.
+    struct Command {
+        std::string title;
+        std::function<void()> action;
+    };
+
+    void goBack();
+
     Notice _notice;
+    Command _headerCommand;
+    Command _leave;
+    bool _namesWindow = true;
     bool _isToolbarHidden = true;
     bool _isOnScreen = false;
 };
