@@ -11,9 +11,9 @@
 
 #include <functional>
 
-class QTableWidget;
-
 namespace velmora {
+
+class ChartTableWidget;
 
 /// Draws a chart's model and lets the user move its range and cursor.
 class ChartWidget : public QWidget {
@@ -44,11 +44,10 @@ public:
     /// How often the chart was drawn.
     [[nodiscard]] std::size_t paintCount() const { return _paintCount; }
     /// Null until it was shown for the first time.
-    [[nodiscard]] QTableWidget* table() const { return _table; }
+    [[nodiscard]] ChartTableWidget* table() const { return _table; }
 
 protected:
     bool event(QEvent* event) override;
-    bool eventFilter(QObject* watched, QEvent* event) override;
     void paintEvent(QPaintEvent* event) override;
     void keyPressEvent(QKeyEvent* event) override;
     void wheelEvent(QWheelEvent* event) override;
@@ -66,8 +65,13 @@ private:
     void fillTable();
 
     ChartInput _input{*this};
-    ChartScale _painted; ///< as of the last drawing
-    QTableWidget* _table = nullptr;
+    [[nodiscard]] std::vector<std::optional<Sample>> readingSamples() const;
+
+    // As of the last drawing.
+    ChartScale _painted;
+    std::vector<std::optional<Sample>> _paintedSamples;
+
+    ChartTableWidget* _table = nullptr;
     std::size_t _paintCount = 0;
 };
 

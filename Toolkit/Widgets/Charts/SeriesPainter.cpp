@@ -16,7 +16,7 @@ namespace velmora {
 namespace {
 
 constexpr double thickness = 1.6;
-constexpr double markSize = 6;
+constexpr double markSize = 7;
 constexpr double markDistance = 96;
 
 /// Lengths of dashes and spaces in points, beginning with a dash.
@@ -30,19 +30,15 @@ std::vector<int> dashes(ChartLine line) {
     return {};
 }
 
-/// Whether a place along the line is in a space between dashes.
-bool isSpace(ChartLine line, std::int64_t along) {
-    const std::vector<int> lengths = dashes(line);
-    int period = 0;
-    for (const int length : lengths)
-        period += length;
-    if (period == 0)
-        return false;
-    auto rest = static_cast<int>(along % period);
-    for (std::size_t index = 0; index < lengths.size(); rest -= lengths[index], ++index)
-        if (rest < lengths[index])
-            return index % 2 == 1;
-    return false;
+/// For each point of a period of the pattern whether it is in a dash.
+std::vector<bool> dashPoints(ChartLine line) {
+    std::vector<bool> points;
+    bool isDash = true;
+    for (const int length : dashes(line)) {
+        points.insert(points.end(), static_cast<std::size_t>(length), isDash);
+        isDash = !isDash;
+    }
+    return points;
 }
 
 } // namespace
@@ -120,6 +116,7 @@ void SeriesPainter::drawColumns(const ChartSeries& series, std::size_t end) {
     _bars.clear();
     _joints.clear();
     _marks.clear();
+    _isDash = dashPoints(series.line);
     const SampleColumn* previous = nullptr;
     for (std::size_t column = 0; column < _columns.size(); ++column) {
         if (_columns[column].extremes.isEmpty())
@@ -143,7 +140,7 @@ void SeriesPainter::drawColumns(const ChartSeries& series, std::size_t end) {
     _painter.setRenderHint(QPainter::Antialiasing);
     _painter.setPen(pen(series.line, _color));
     _painter.drawLines(_joints.data(), static_cast<int>(_joints.size()));
-    _painter.setPen(Qt::NoPen);
+    _painter.setPen(QPen(_ground, 1.5)); // an edge, by which marks stand out from bars of their own colour
     _painter.setBrush(_color);
     for (const QPointF& mark : _marks)
         drawLineMark(_painter, series.line, mark, markSize);
@@ -175,7 +172,8 @@ void SeriesPainter::addColumn(const ChartSeries& series, std::size_t column, con
     // Where the line is level a dash can be left out without hiding anything.
     const std::int64_t along = _scale.begin_ns / _scale.column_ns + static_cast<std::int64_t>(column);
     const bool isLevel = bottom - top <= std::lround(2 * thickness * ratio);
-    if (!isLevel || !isSpace(series.line, static_cast<std::int64_t>(static_cast<double>(along) / ratio)))
+    const auto point = static_cast<std::size_t>(std::abs(static_cast<double>(along) / ratio));
+    if (!isLevel || _isDash.empty() || _isDash[point % _isDash.size()])
         _bars.emplace_back(static_cast<int>(std::lround(_scale.left * ratio)) + static_cast<int>(column), top,
                            1, bottom - top);
     const auto distance = static_cast<std::int64_t>(markDistance * ratio);

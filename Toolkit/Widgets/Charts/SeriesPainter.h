@@ -24,7 +24,8 @@ namespace velmora {
 /// greatest of each column of pixels where there are many.
 class SeriesPainter {
 public:
-    SeriesPainter(QPainter& painter, const ChartScale& scale) : _painter(painter), _scale(scale) {}
+    SeriesPainter(QPainter& painter, const ChartScale& scale, const QColor& ground)
+        : _painter(painter), _scale(scale), _ground(ground) {}
 
     void draw(const ChartSeries& series, const QColor& color, const QRectF& plot, const ValueAxis& axis);
 
@@ -41,9 +42,11 @@ private:
 
     QPainter& _painter;
     const ChartScale& _scale;
+    QColor _ground;
     QColor _color;
     QRectF _plot;
     ValueAxis _axis;
+    std::vector<bool> _isDash; ///< of a period of the line's pattern, by points; empty for solid lines
     std::vector<SampleColumn> _columns;
     std::vector<QRect> _bars;    ///< in device pixels
     std::vector<QLineF> _joints; ///< over columns without samples
