@@ -35,6 +35,8 @@ bool analyseFile(std::uint32_t index, const AnalysedInput& input, AnalysisFeed& 
     if (!reader) {
         report(title + ": " + reader.reason());
         feed.reportLoss({{index, 1}, reader.reason()});
+        if (input.fails)
+            input.fails(index, reader.reason());
         return false;
     }
     if (input.showsProgress)
@@ -58,8 +60,13 @@ bool analyseFile(std::uint32_t index, const AnalysedInput& input, AnalysisFeed& 
     if (analysed && !resources.failure().empty())
         analysed = Failure{"decoded without its template: " + resources.failure()};
     clearProgress();
-    if (!analysed)
+    if (input.endsFile)
+        input.endsFile(index, **reader);
+    if (!analysed) {
         report(title + ": " + analysed.reason());
+        if (input.fails)
+            input.fails(index, analysed.reason());
+    }
     const bool allDecoded = analysed && messages.undecoded().report(title);
     const bool whole = reportLosses(**reader, title);
     sumUp();
