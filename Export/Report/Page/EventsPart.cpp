@@ -87,7 +87,7 @@ void writeEvents(Markup& out, const DriveReport& report) {
             .raw(pageCount(rows))
             .raw(" of ")
             .raw(pageCount(events.items().size()))
-            .raw(" events. The page lists all of them where scripts are on.</p>\n");
+            .raw(" events. The list beside the charts has all of them where scripts are on.</p>\n");
     out.raw("</div>\n");
     if (events.omitted() != 0)
         out.raw("<p>")
