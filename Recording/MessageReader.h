@@ -89,6 +89,8 @@ protected:
     /// Whether the next loss will be kept, so that its reason is worth composing.
     [[nodiscard]] bool keepsLoss() const { return _losses.size() < maximumLosses; }
     void addLoss(Loss loss);
+    /// Where the losses are another reader's, of which not all are kept.
+    void setLossTotals(const LossTotals& totals) { _lossTotals = totals; }
     void addComment(Comment comment) { _comments.add(std::move(comment)); }
 
 private:

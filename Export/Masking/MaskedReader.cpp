@@ -71,6 +71,7 @@ std::optional<LoggedMessage> MaskedReader::next() {
 void MaskedReader::addLosses() {
     for (; _losses < _reader.losses().size(); ++_losses)
         addLoss(_reader.losses()[_losses]);
+    setLossTotals(_reader.lossTotals());
 }
 
 } // namespace velmora

@@ -72,7 +72,8 @@ struct MessageMask::Technology {
 };
 
 MessageMask::MessageMask(const MaskOptions& options)
-    : _options(options), _pseudonyms(_options), _propertyLists(_options, _pseudonyms, _report) {}
+    : _options(options), _pseudonyms(_options), _propertyLists(_options, _pseudonyms, _report),
+      _shift(_options.shift && _options.masksTimes() ? TimeShift(*_options.shift) : TimeShift()) {}
 
 MessageMask::~MessageMask() = default;
 

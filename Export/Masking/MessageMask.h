@@ -12,6 +12,7 @@
 #include "Platform/Bytes.h"
 #include "Recording/MessageReader.h"
 
+#include <chrono>
 #include <map>
 #include <memory>
 #include <optional>
@@ -40,6 +41,10 @@ public:
 
     [[nodiscard]] const MaskReport& report() const { return _report; }
     [[nodiscard]] const MaskOptions& options() const { return _options; }
+    /// What is subtracted from times; absent before the first message, and where times stay.
+    [[nodiscard]] std::optional<std::chrono::nanoseconds> shift() const {
+        return _shift.hasBegun() ? std::optional(_shift.shift()) : std::nullopt;
+    }
 
 private:
     struct Technology;

@@ -10,6 +10,7 @@
 #include "Export/Masking/NumberPseudonyms.h"
 #include "Export/Masking/TextPseudonyms.h"
 
+#include <chrono>
 #include <optional>
 
 namespace velmora {
@@ -21,6 +22,8 @@ struct MaskOptions {
     bool keepsUnknown = false; ///< what is not known to be harmless stays too
     /// The level at which the messages have been masked with the same key already: that is not done again.
     std::optional<MaskLevel> done = std::nullopt;
+    /// What is subtracted from times where they are masked; absent for what the first message decides.
+    std::optional<std::chrono::nanoseconds> shift = std::nullopt;
 
     [[nodiscard]] bool masksIdentities() const { return !done; }
     [[nodiscard]] bool masksAreas() const {

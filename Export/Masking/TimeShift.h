@@ -14,6 +14,10 @@ namespace velmora {
 /// Moves the times of a file so that its first message arrives at an epoch that all masked files have.
 class TimeShift {
 public:
+    TimeShift() = default;
+    /// By so much instead.
+    explicit TimeShift(std::chrono::nanoseconds shift) : _hasBegun(true), _shift(shift) {}
+
     /// 2000-01-01 00:00:00 UTC.
     static constexpr Time epoch = std::chrono::sys_days(std::chrono::year(2000) / 1 / 1);
 
@@ -23,6 +27,7 @@ public:
             _shift = std::max(first, Time()) - epoch;
         _hasBegun = true;
     }
+    [[nodiscard]] bool hasBegun() const { return _hasBegun; }
     /// What is subtracted from each time.
     [[nodiscard]] std::chrono::nanoseconds shift() const { return _shift; }
     /// As far as there are times.

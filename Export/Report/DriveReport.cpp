@@ -42,8 +42,8 @@ TechnologyReport& DriveReport::of(const Catalogue& catalogue) {
     for (const auto& each : _technologies)
         if (&each->catalogue() == &catalogue)
             return *each;
-    TechnologyReport& report =
-        *_technologies.emplace_back(std::make_unique<TechnologyReport>(catalogue, _groups, _events));
+    TechnologyReport& report = *_technologies.emplace_back(std::make_unique<TechnologyReport>(
+        catalogue, _options.rules ? &_options.rules->classes() : nullptr, _groups, _events));
     if (_options.rules)
         report.add(makeRuleDetector(*_options.rules, catalogue));
     return report;

@@ -12,8 +12,9 @@
 
 namespace velmora {
 
-TechnologyReport::TechnologyReport(const Catalogue& catalogue, StatisticsGroups& groups, ReportEvents& events)
-    : _engine(catalogue, events), _statistics(catalogue, groups),
+TechnologyReport::TechnologyReport(const Catalogue& catalogue, const LevelClasses* classes,
+                                   StatisticsGroups& groups, ReportEvents& events)
+    : _classes(classes), _engine(catalogue, events), _statistics(catalogue, groups),
       _isByFile(groups.plan().by == StatisticsPlan::By::File) {}
 
 const TechnologyReport::Use& TechnologyReport::useOf(const CatalogueField& leaf) {
@@ -43,8 +44,9 @@ std::chrono::nanoseconds TechnologyReport::pass(Time time) {
 void TechnologyReport::report(const MessageReport& report) {
     const std::chrono::nanoseconds passed = pass(report.time);
     if (passed.count() > 0)
-        _shares.add(_engine.picture().technology(), std::nullopt, passed);
+        _shares.add(_engine.picture().technology(), _class, passed);
     _engine.report(report);
+    classify();
     _statistics.report(report);
     _cells.report(report, _engine.picture(), passed);
     observe(report);
@@ -84,6 +86,18 @@ void TechnologyReport::observe(const MessageReport& report) {
     _neighbours.report(report, _engine.picture());
 }
 
+void TechnologyReport::classify() {
+    const RadioPicture& picture = _engine.picture();
+    const Reading* const level = picture.find(Role::ServingLevel);
+    const std::optional<double> value = level ? std::optional(level->number) : std::nullopt;
+    const std::optional<RadioTechnology> technology = picture.technology();
+    if (value == _classLevel && technology == _classTechnology)
+        return;
+    _classLevel = value;
+    _classTechnology = technology;
+    _class = value && _classes ? _classes->of(technology, Role::ServingLevel, *value) : std::nullopt;
+}
+
 void TechnologyReport::setBands(const MessageReport& report) {
     const RadioPicture& picture = _engine.picture();
     const auto textOf = [&picture](Role role) -> std::optional<std::string_view> {
@@ -98,6 +112,7 @@ void TechnologyReport::setBands(const MessageReport& report) {
     _modeBand.set(report.time, nameOfAny(picture.mode()));
     _radioBand.set(report.time, textOf(Role::RadioState));
     _registrationBand.set(report.time, textOf(Role::RegistrationState));
+    _classBand.set(report.time, nameOfAny(_class));
     // By number: what is known of a cell, and so its name, grows while it serves.
     if (_cells.number() == _bandCell)
         return;
@@ -111,7 +126,8 @@ void TechnologyReport::setBands(const MessageReport& report) {
 }
 
 void TechnologyReport::forget(Time time) {
-    for (StateBand* const band : {&_technologyBand, &_modeBand, &_radioBand, &_registrationBand, &_cellBand})
+    for (StateBand* const band :
+         {&_technologyBand, &_classBand, &_modeBand, &_radioBand, &_registrationBand, &_cellBand})
         band->end(time);
     _cells.interrupt();
     _bandCell = ServingCells::unknown;
@@ -156,7 +172,7 @@ void TechnologyReport::finish() {
 std::vector<const StateBand*> TechnologyReport::bands() const {
     std::vector<const StateBand*> bands;
     for (const StateBand* const band :
-         {&_technologyBand, &_modeBand, &_radioBand, &_registrationBand, &_cellBand})
+         {&_technologyBand, &_classBand, &_modeBand, &_radioBand, &_registrationBand, &_cellBand})
         if (!band->isEmpty())
             bands.push_back(band);
     return bands;

@@ -3,6 +3,7 @@
 
 #pragma once
 
+#include "Analysis/Classes/LevelClasses.h"
 #include "Analysis/Engine/EventEngine.h"
 #include "Analysis/Statistics/TechnologyStatistics.h"
 #include "Export/Report/CellRows.h"
@@ -29,8 +30,9 @@ class ReportEvents;
 /// What a page says of the messages of one technology.
 class TechnologyReport {
 public:
-    /// All must outlive it. Statistics by file have extremes by file.
-    TechnologyReport(const Catalogue& catalogue, StatisticsGroups& groups, ReportEvents& events);
+    /// All must outlive it; `classes` may be null. Statistics by file have extremes by file.
+    TechnologyReport(const Catalogue& catalogue, const LevelClasses* classes, StatisticsGroups& groups,
+                     ReportEvents& events);
     TechnologyReport(const TechnologyReport&) = delete;
     TechnologyReport& operator=(const TechnologyReport&) = delete;
 
@@ -66,9 +68,11 @@ private:
     [[nodiscard]] const Use& useOf(const CatalogueField& leaf);
     [[nodiscard]] std::chrono::nanoseconds pass(Time time);
     void observe(const MessageReport& report);
+    void classify();
     void setBands(const MessageReport& report);
     void forget(Time time);
 
+    const LevelClasses* _classes;
     EventEngine _engine;
     TechnologyStatistics _statistics;
     CellRows _cells;
@@ -81,10 +85,14 @@ private:
     StateBand _technologyBand{"radio technology"};
     StateBand _modeBand{"mode"};
     StateBand _radioBand{"radio state"};
+    StateBand _classBand{"level class"};
     StateBand _registrationBand{"registration"};
     StateBand _cellBand{"serving cell"};
     std::uint32_t _bandCell = ServingCells::unknown; ///< the cell's number, in that band
-    std::optional<Time> _last;                       ///< of the latest message; absent after an interruption
+    std::optional<LevelClass> _class;                ///< of the serving cell's level
+    std::optional<RadioTechnology> _classTechnology; ///< that it is for
+    std::optional<double> _classLevel;
+    std::optional<Time> _last; ///< of the latest message; absent after an interruption
 };
 
 } // namespace velmora

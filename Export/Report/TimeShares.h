@@ -3,6 +3,7 @@
 
 #pragma once
 
+#include "Analysis/Classes/LevelClass.h"
 #include "Analysis/Picture/RadioTechnology.h"
 
 #include <array>
@@ -15,15 +16,15 @@ namespace velmora {
 /// How long the phone was served by which radio technology, and how well.
 class TimeShares {
 public:
-    static constexpr std::size_t classes = 4; ///< from the poorest on
+    static constexpr std::size_t classes = levelClasses.size();
     /// The index of what is not known, of technologies and of classes.
     static constexpr std::size_t noTechnology = radioTechnologies;
     static constexpr std::size_t noClass = classes;
 
-    void add(std::optional<RadioTechnology> technology, std::optional<std::size_t> levelClass,
+    void add(std::optional<RadioTechnology> technology, std::optional<LevelClass> levelClass,
              std::chrono::nanoseconds time) {
         const std::size_t row = technology ? static_cast<std::size_t>(*technology) : noTechnology;
-        _times[row][levelClass.value_or(noClass)] += time;
+        _times[row][levelClass ? static_cast<std::size_t>(*levelClass) : noClass] += time;
     }
 
     [[nodiscard]] std::chrono::nanoseconds time(std::size_t technology, std::size_t levelClass) const {

@@ -226,12 +226,12 @@ _velmora_log() {
     convert) options+=(--force --from --to --code --technology --description --strict) ;;
     info) options+=(--format --technology) ;;
     fields) options+=(--technology --role --format --safe) ;;
-    events) options+=(--format --safe --records --live --clock --technology --kind --severity --from --to --rules
+    events) options+=(--format --safe --records --live --clock --technology --mask --key --kind --severity --from --to --rules
         --no-rules --exec --exec-timeout --fail-on --duration --count --timeout) ;;
     stats) options+=(--format --safe --histogram --by --select --role --from --to --clock --technology) ;;
     diff) options+=(--format --display --select --role --clock --technology) ;;
     mask) options+=(--level --key --technology --keep-unknown --report --force --new-key --check --known) ;;
-    columns) options+=(--out --compact --technology) ;;
+    columns) options+=(--out --compact --technology --mask --key) ;;
     esac
     if [[ $cur == -* ]]; then
         _velmora_offer "${options[@]}"

@@ -10,16 +10,22 @@
 #include "Tools/Decode/ShownProgress.h"
 #include "Tools/Decode/TrackedResources.h"
 #include "Tools/Log/DecoderLog.h"
+#include "Tools/Mask/MaskedInput.h"
 #include "Tools/Report.h"
 
 #include <memory>
 #include <optional>
+#include <string>
+#include <vector>
 
 namespace velmora {
 
 namespace {
 
-bool analyseFile(std::uint32_t index, const AnalysedInput& input, AnalysisFeed& feed, DecoderLines& lines) {
+/// `masking` gets how times move: the files follow each other, and one that began at the same time again
+/// would interrupt what the others report.
+bool analyseFile(std::uint32_t index, const AnalysedInput& input, std::optional<MaskOptions>& masking,
+                 AnalysisFeed& feed, DecoderLines& lines) {
     const std::string& path = input.files[index];
     const std::string title = fileTitle(path);
     std::optional<ShownProgress> progress;
@@ -54,14 +60,19 @@ bool analyseFile(std::uint32_t index, const AnalysedInput& input, AnalysisFeed& 
     });
     const DecoderLog log(lines);
     const TrackedResources resources;
-    FileMessages messages(**reader, {index, path, input.technology}, feed, context);
+    MaskedInput masked(
+        **reader, path, input.technology,
+        masking && !input.technology.empty() ? technologiesOf(path) : std::vector<std::string>(), masking);
+    FileMessages messages(masked.reader(), {index, path, input.technology}, feed, context);
     messages.setProgress(progress ? progress->get() : nullptr);
     Result<Done> analysed = messages.run(input.isDone);
     if (analysed && !resources.failure().empty())
         analysed = Failure{"decoded without its template: " + resources.failure()};
     clearProgress();
+    if (masking && masked.shift())
+        masking->shift = masked.shift();
     if (input.endsFile)
-        input.endsFile(index, **reader);
+        input.endsFile(index, masked.reader());
     if (!analysed) {
         report(title + ": " + analysed.reason());
         if (input.fails)
@@ -77,10 +88,11 @@ bool analyseFile(std::uint32_t index, const AnalysedInput& input, AnalysisFeed& 
 
 bool analyseFiles(const AnalysedInput& input, AnalysisFeed& feed, DecoderLines& lines) {
     bool good = true;
+    std::optional<MaskOptions> masking = input.masking;
     for (std::uint32_t index = 0; index < input.files.size() && !(input.isDone && input.isDone()); ++index) {
         if (input.beginsFile)
             input.beginsFile(index);
-        good = analyseFile(index, input, feed, lines) && good;
+        good = analyseFile(index, input, masking, feed, lines) && good;
     }
     return good;
 }

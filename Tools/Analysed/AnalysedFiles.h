@@ -3,11 +3,13 @@
 
 #pragma once
 
+#include "Export/Masking/Pseudonyms.h"
 #include "Tools/Analysed/AnalysisFeed.h"
 #include "Tools/Log/DecoderLines.h"
 
 #include <cstdint>
 #include <functional>
+#include <optional>
 #include <string>
 #include <vector>
 
@@ -17,8 +19,9 @@ namespace velmora {
 struct AnalysedInput {
     std::vector<std::string> files; ///< "-" is standard input
     std::string technology;         ///< overrides a file's, or chooses one of several; empty for the files'
-    bool showsProgress = true;      ///< of long files, on standard error where that is a terminal
-    bool writesAsItGoes = false;    ///< the output is written to while files are read
+    std::optional<MaskOptions> masking; ///< absent for messages as they are
+    bool showsProgress = true;          ///< of long files, on standard error where that is a terminal
+    bool writesAsItGoes = false;        ///< the output is written to while files are read
     std::function<void(std::uint32_t input)> beginsFile = {}; ///< the next file, before its messages
     std::function<void()> beforeWaiting = {};                 ///< more is waited for, as of a pipe
     std::function<bool()> whileWaiting = {};                  ///< as FileSource's hook

@@ -8,11 +8,13 @@
 #include "Tools/Columns/ColumnFiles.h"
 #include "Tools/Columns/ColumnsObserver.h"
 #include "Tools/Columns/Compaction.h"
+#include "Tools/Columns/ContentHash.h"
 #include "Tools/Columns/HashedInput.h"
 #include "Tools/Columns/JoinedFiles.h"
 #include "Tools/ExitStatus.h"
 #include "Tools/Log/DecoderLog.h"
 #include "Tools/LogOverride.h"
+#include "Tools/Mask/MaskedInput.h"
 #include "Tools/Output.h"
 #include "Tools/Report.h"
 
@@ -22,6 +24,7 @@
 #include <set>
 #include <string>
 #include <system_error>
+#include <vector>
 
 namespace velmora {
 
@@ -51,14 +54,16 @@ struct Begin {
     std::string technology; ///< empty where the file does not name it
 };
 
-Result<Begin> beginOf(const HashedInput& input) {
+Result<Begin> beginOf(const std::string& path, const HashedInput& input, const ColumnsOptions& options,
+                      const std::optional<MaskOptions>& masking) {
     InputError error;
     const Result<std::unique_ptr<MessageReader>> reader = openAgain(input, error);
     if (!reader)
         return Failure{reader.reason()};
-    (*reader)->setReadsAllTechnologies(true);
+    MaskedInput masked(**reader, path, options.technology, {}, masking);
+    masked.reader().setReadsAllTechnologies(true);
     Begin begin;
-    if (const std::optional<LoggedMessage> message = (*reader)->next())
+    if (const std::optional<LoggedMessage> message = masked.reader().next())
         begin.first = message->time;
     begin.technology = (*reader)->technology();
     if (error.reason)
@@ -66,10 +71,24 @@ Result<Begin> beginOf(const HashedInput& input) {
     return begin;
 }
 
-InputFile fileOf(const std::string& path, const HashedInput& input, const MessageReader& reader) {
+/// By what all tables name the input. Masked it is another one, so that it never counts as what is there
+/// unmasked, or masked less.
+std::string hashOf(const HashedInput& input, const std::optional<MaskOptions>& masking) {
+    if (!masking)
+        return input.hash();
+    ContentHash hash;
+    for (const std::string& each :
+         {input.hash(), std::string(nameOf(masking->level)), masking->key.fingerprint()})
+        hash.add(std::vector<std::uint8_t>(each.begin(), each.end()));
+    return hash.digits();
+}
+
+InputFile fileOf(const std::string& path, const HashedInput& input, const MessageReader& reader,
+                 const std::optional<MaskOptions>& masking) {
     InputFile file;
-    file.hash = input.hash();
-    file.name = path;
+    file.hash = hashOf(input, masking);
+    // Directories may have the name of a person.
+    file.name = masking ? std::filesystem::path(path).filename().string() : path;
     file.form = reader.form();
     file.size = input.size();
     file.losses = reader.lossTotals().losses;
@@ -80,14 +99,15 @@ InputFile fileOf(const std::string& path, const HashedInput& input, const Messag
 
 /// Decodes a file and writes its tables.
 Outcome writeFile(const std::string& path, const HashedInput& input, const Begin& begin,
-                  const ColumnsOptions& options, DecoderLines& lines) {
+                  const ColumnsOptions& options, const std::optional<MaskOptions>& masking,
+                  DecoderLines& lines) {
     const std::string title = fileTitle(path);
     InputError error;
     const Result<std::unique_ptr<MessageReader>> reader = openAgain(input, error);
     if (!reader)
         return failed(title, reader.reason());
-    ColumnFiles files(options.out, dateOf(begin.first), input.hash());
-    InputColumns columns(fileOf(path, input, **reader), files);
+    ColumnFiles files(options.out, dateOf(begin.first), hashOf(input, masking));
+    InputColumns columns(fileOf(path, input, **reader, masking), files);
     ColumnsObserver observer(columns);
     const auto sumUp = [&] { lines.report(options.files.size() > 1 ? printable(title) : std::string()); };
     WorkContext context(title, [&] {
@@ -98,7 +118,8 @@ Outcome writeFile(const std::string& path, const HashedInput& input, const Begin
     if (begin.technology.empty())
         request.technology = options.technology;
     const DecoderLog log(lines);
-    const Result<DecodedFile> decoded = decodeMessages(**reader, request, context, observer);
+    MaskedInput masked(**reader, path, request.technology, {}, masking);
+    const Result<DecodedFile> decoded = decodeMessages(masked.reader(), request, context, observer);
     if (!decoded) {
         static_cast<void>(reportLosses(**reader, title));
         sumUp();
@@ -107,7 +128,7 @@ Outcome writeFile(const std::string& path, const HashedInput& input, const Begin
     const bool allDecoded = decoded->undecoded.report(title);
     const bool whole = reportLosses(**reader, title);
     sumUp();
-    Result<Done> written = columns.finish(fileOf(path, input, **reader));
+    Result<Done> written = columns.finish(fileOf(path, input, **reader, masking));
     // Another time it may be read to its end: what there is of it is not what the input holds.
     if (written && error.reason)
         return {"failed", false}; // for the reason that has been reported
@@ -123,26 +144,32 @@ Outcome writeFile(const std::string& path, const HashedInput& input, const Begin
             allDecoded && whole};
 }
 
-Outcome takeFile(const std::string& path, const ColumnsOptions& options, WrittenInputs& written,
-                 DecoderLines& lines) {
+Outcome takeFile(const std::string& path, const ColumnsOptions& options,
+                 const std::optional<MaskOptions>& masking, WrittenInputs& written, DecoderLines& lines) {
     const std::string title = fileTitle(path);
     const Result<HashedInput> input = HashedInput::open(path);
     if (!input)
         return failed(title, input.reason());
-    const Result<Begin> begin = beginOf(*input);
+    const Result<Begin> begin = beginOf(path, *input, options, masking);
     if (!begin)
         return failed(title, begin.reason());
     const std::string& technology = begin->technology.empty() ? options.technology : begin->technology;
-    if (written.contains(options.out / partitionOf("files", technology, dateOf(begin->first)), input->hash()))
+    if (written.contains(options.out / partitionOf("files", technology, dateOf(begin->first)),
+                         hashOf(*input, masking)))
         return {"there already", true};
-    return writeFile(path, *input, *begin, options, lines);
+    return writeFile(path, *input, *begin, options, masking, lines);
 }
 
 int writeAllFiles(const ColumnsOptions& options, DecoderLines& lines, Output& output) {
+    const Result<std::optional<MaskOptions>> masking = maskOptionsOf(options.mask);
+    if (!masking) {
+        report(masking.reason());
+        return ExitStatus::BadInput;
+    }
     bool good = true;
     WrittenInputs written;
     for (const std::string& path : options.files) {
-        const Outcome outcome = takeFile(path, options, written, lines);
+        const Outcome outcome = takeFile(path, options, *masking, written, lines);
         good = good && outcome.isGood;
         output.put(printable(fileTitle(path)) + ": " + outcome.text + "\n");
         output.flush();

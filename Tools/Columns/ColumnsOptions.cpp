@@ -21,6 +21,7 @@ CLI::App* addColumns(CLI::App& app, ColumnsOptions& options) {
                      "Join the small files of each table, technology and day in this directory instead")
         ->type_name("DIR");
     addTechnologyOption(*command, options.technology, "The technology of files that do not name theirs");
+    addMaskOption(*command, options.mask);
     command->callback([&options] {
         if (options.out.empty() == options.compact.empty())
             throw CLI::ValidationError("columns", options.out.empty()
@@ -30,6 +31,8 @@ CLI::App* addColumns(CLI::App& app, ColumnsOptions& options) {
             throw CLI::ValidationError("--out", "got no FILE, wanted at least one");
         if (!options.compact.empty() && !options.files.empty())
             throw CLI::ValidationError("--compact", "got " + options.files.front() + ", wanted no FILE");
+        if (!options.compact.empty() && options.mask.level)
+            throw CLI::ValidationError("--compact", "got --mask too, wanted one of the two");
     });
     command->footer(
         "A FILE becomes DIR/TABLE/technology=T/date=D/HASH.parquet for each of its tables: T is its "
@@ -42,8 +45,15 @@ CLI::App* addColumns(CLI::App& app, ColumnsOptions& options) {
         "not exist. A line for each FILE says what was done; losses in one give exit status 1, and the rest "
         "of it\n"
         "is written. Let nothing else write to DIR, or read it, while --compact works on it.\n\n"
+        "--mask masks what identifies the subscriber, --mask=location the network and its areas too, "
+        "--mask=all\n"
+        "positions and times too, as velmora-log mask does; times are then counted from 2000-01-01, and D is "
+        "that\n"
+        "day. HASH is then that of level and key too: the same command continues where it has the same "
+        "--key.\n\n"
         "Examples:\n"
         "  velmora-log columns --out week monday/*.pcapng tuesday/*.pcapng\n"
+        "  velmora-log columns --mask=location --key fleet.key --out shared monday/*.pcapng\n"
         "  velmora-log columns --compact week\n"
         "  duckdb -c \"SELECT * FROM 'week/messages/**/*.parquet' LIMIT 5\"");
     return command;

@@ -3,6 +3,8 @@
 
 #pragma once
 
+#include "Tools/Mask/MaskOption.h"
+
 #include <string>
 #include <vector>
 
@@ -17,6 +19,7 @@ struct ColumnsOptions {
     std::string out;        ///< the directory of the tables; empty where files are joined
     std::string compact;    ///< the directory whose files are joined; empty for none
     std::string technology; ///< of files that name none
+    MaskOption mask;
     std::vector<std::string> files;
 };
 

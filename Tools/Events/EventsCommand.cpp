@@ -39,6 +39,11 @@ bool reportErrors(const RuleSet& rules, const std::vector<std::string>& given) {
 
 int runEvents(const EventsOptions& given, DecoderLines& lines, Output& output) {
     EventsOptions options = given;
+    const Result<std::optional<MaskOptions>> masking = maskOptionsOf(options.mask);
+    if (!masking) {
+        report(masking.reason());
+        return ExitStatus::BadInput;
+    }
     std::optional<DecoderLog> log(std::in_place, lines); // of the decoders whose catalogues are made
     const AllCatalogues catalogues;
     log.reset();
@@ -51,10 +56,13 @@ int runEvents(const EventsOptions& given, DecoderLines& lines, Output& output) {
         return ExitStatus::Usage;
     }
     if (!options.files.empty())
-        return listFileEvents(options, rules, lines, output);
+        return listFileEvents(options, rules, *masking, lines, output);
     options.isLive = true;
     ServiceClient client;
-    return LiveEvents(options, rules, lines, client, output).run();
+    std::optional<MessageMask> mask;
+    if (*masking)
+        mask.emplace(**masking);
+    return LiveEvents(options, rules, lines, client, output, mask ? &*mask : nullptr).run();
 }
 
 } // namespace velmora

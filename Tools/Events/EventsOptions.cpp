@@ -108,6 +108,7 @@ void addFormat(CLI::App& command, EventsOptions& options) {
         ->check(oneOf({"arrival", "modem"}))
         ->type_name("arrival|modem");
     addTechnology(command, options.technology, "Analyse as");
+    addMaskOption(command, options.mask);
 }
 
 void addPrograms(CLI::App& command, EventsOptions& options) {
@@ -187,12 +188,13 @@ CLI::App* addEvents(CLI::App& app, EventsOptions& options) {
         "Documentation/events.md and of rules. The jsonl conforms to velmora-log-events.schema.json.\n\n"
         "--exec runs at most one program at a time for events of a kind. With FILE the next event of that\n"
         "kind waits for it; live it has no program, and how many had none is reported.\n\n" +
-        std::string(timeHelp) +
-        "With several files that is the first message of all.\n\n"
+        std::string(timeHelp) + "With several files that is the first message of all.\n\n" + maskHelp +
+        "\n"
         "Examples:\n"
         "  velmora-log events gsm.pcapng lte.pcapng\n"
         "  velmora-log events --severity warning --from +3600 drive.pcapng\n"
         "  velmora-log events --kind handover,cell-reselection --format jsonl drive.pcapng | jq .fields.to\n"
+        "  velmora-log events --mask=location drive.pcapng\n"
         "  velmora-log events --rules my.toml --fail-on warning drive.pcapng; echo $?\n"
         "  velmora-log events --severity critical --exec 'notify-send Velmora'");
     command->callback([&options] { checkTogether(options); });

@@ -6,6 +6,7 @@
 #include "Analysis/Events/Event.h"
 #include "Tools/Analysed/AnalysisClock.h"
 #include "Tools/Events/EventSelection.h"
+#include "Tools/Mask/MaskOption.h"
 #include "Tools/Text/CSVText.h"
 
 #include <cstdint>
@@ -30,6 +31,7 @@ struct EventsOptions {
     EventSelection selection;
     AnalysisClock clock = AnalysisClock::Arrival;
     std::string technology; ///< overrides the files', or chooses one of several; empty for the files'
+    MaskOption mask;
     /// Events as soon as they are known, and those that last at their begin too; always without files.
     bool isLive = false;
     std::vector<std::string> rules; ///< files

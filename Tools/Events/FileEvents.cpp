@@ -42,7 +42,8 @@ private:
 
 } // namespace
 
-int listFileEvents(const EventsOptions& options, const RuleSet& rules, DecoderLines& lines, Output& output) {
+int listFileEvents(const EventsOptions& options, const RuleSet& rules,
+                   const std::optional<MaskOptions>& masking, DecoderLines& lines, Output& output) {
     std::unique_ptr<ProgramSignals> signals;
     if (!options.program.empty())
         signals = std::make_unique<ProgramSignals>();
@@ -50,6 +51,7 @@ int listFileEvents(const EventsOptions& options, const RuleSet& rules, DecoderLi
     AnalysedInput input;
     input.files = options.files;
     input.technology = options.technology;
+    input.masking = masking;
     input.writesAsItGoes = true;
     input.beforeWaiting = [&listing] { listing.flush(); };
     input.cleanUp = [&listing] { listing.flush(); };

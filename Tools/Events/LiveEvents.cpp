@@ -31,8 +31,8 @@ std::chrono::nanoseconds nanosecondsOf(double seconds) {
 } // namespace
 
 LiveEvents::LiveEvents(const EventsOptions& options, const RuleSet& rules, DecoderLines& lines,
-                       ServiceClient& client, Output& output)
-    : _options(options), _lines(lines), _client(client), _output(output),
+                       ServiceClient& client, Output& output, MessageMask* mask)
+    : _options(options), _lines(lines), _client(client), _output(output), _mask(mask),
       _listing(options, rules, output, [] { return SignalWatcher::hasSignal(); }),
       _log(lines, [this](const std::string& problem) { reportProblem(problem); }) {
     RecordingModel::Events events;
@@ -104,8 +104,12 @@ void LiveEvents::take(const Data& message) {
         logged.time = _client.clock.now();
         logged.message = message;
         logged.number = ++_messages;
-        if (const std::optional<std::string> reason = _technology->decode(logged, 0))
-            report("message " + std::to_string(logged.number) + ": " + *reason);
+        std::optional<LoggedMessage> taken(std::move(logged));
+        if (_mask)
+            taken = _mask->mask(*std::move(taken), _technology->technology());
+        const auto reason = taken ? _technology->decode(*taken, 0) : std::nullopt;
+        if (reason)
+            report("message " + std::to_string(_messages) + ": " + *reason);
     }
     if ((_options.count && _messages >= *_options.count) || _listing.isDone())
         end(true);

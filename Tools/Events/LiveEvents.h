@@ -4,6 +4,7 @@
 #pragma once
 
 #include "Analysis/Rules/RuleSet.h"
+#include "Export/Masking/MessageMask.h"
 #include "Tools/Events/EventListing.h"
 #include "Tools/Events/EventsOptions.h"
 #include "Tools/Log/DecoderLines.h"
@@ -23,9 +24,9 @@ namespace velmora {
 /// thread only.
 class LiveEvents {
 public:
-    /// All must outlive it.
+    /// `mask` may be null, for messages as they are. All must outlive it.
     LiveEvents(const EventsOptions& options, const RuleSet& rules, DecoderLines& lines, ServiceClient& client,
-               Output& output);
+               Output& output, MessageMask* mask);
 
     /// Runs the client's event loop. Returns the exit status.
     int run();
@@ -44,6 +45,7 @@ private:
     DecoderLines& _lines;
     ServiceClient& _client;
     Output& _output;
+    MessageMask* _mask;
     EventListing _listing;
     ServiceLog _log;
     std::shared_ptr<RecordingModel> _model;

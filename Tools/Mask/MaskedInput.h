@@ -6,6 +6,7 @@
 #include "Export/Masking/MaskedReader.h"
 #include "Export/Masking/MessageMask.h"
 
+#include <chrono>
 #include <optional>
 #include <string>
 #include <vector>
@@ -23,6 +24,10 @@ public:
     MaskedInput& operator=(const MaskedInput&) = delete;
 
     [[nodiscard]] MessageReader& reader() { return *_reader; }
+    /// What is subtracted from times; absent before the first message, and where times stay.
+    [[nodiscard]] std::optional<std::chrono::nanoseconds> shift() const {
+        return _mask ? _mask->shift() : std::nullopt;
+    }
 
 private:
     MessageReader* _reader;

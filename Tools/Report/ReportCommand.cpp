@@ -43,11 +43,12 @@ std::vector<std::string> shownNames(const std::vector<std::string>& files) {
 }
 
 /// Reads the files into the report. Returns whether all of them was read.
-bool readFiles(const ReportOptions& options, DriveReport& page, AnalysisFeed& feed, DecoderLines& lines,
-               std::function<void()> cleanUp) {
+bool readFiles(const ReportOptions& options, const std::optional<MaskOptions>& masking, DriveReport& page,
+               AnalysisFeed& feed, DecoderLines& lines, std::function<void()> cleanUp) {
     AnalysedInput input;
     input.files = options.files;
     input.technology = options.technology;
+    input.masking = masking;
     input.cleanUp = std::move(cleanUp);
     input.endsFile = [&page](std::uint32_t index, const MessageReader& reader) {
         page.endInput(index, reader);
@@ -70,8 +71,8 @@ bool writePage(const DriveReport& page, const ReportOptions& options, AtomicFile
 }
 
 /// Whether all of the input is on the page now.
-bool makePage(const ReportOptions& options, const RuleSet& rules, const std::filesystem::path& target,
-              DecoderLines& lines) {
+bool makePage(const ReportOptions& options, const RuleSet& rules, const std::optional<MaskOptions>& masking,
+              const std::filesystem::path& target, DecoderLines& lines) {
     Result<AtomicFile> file = AtomicFile::create(target, newFileMode);
     if (!file) {
         report(options.out + ": " + file.reason());
@@ -89,7 +90,7 @@ bool makePage(const ReportOptions& options, const RuleSet& rules, const std::fil
         return std::make_unique<ReportAnalysis>(*page, catalogue);
     });
     page.emplace(std::move(setup));
-    const bool good = readFiles(options, *page, feed, lines, [&file] { file->discard(); });
+    const bool good = readFiles(options, masking, *page, feed, lines, [&file] { file->discard(); });
     page->finish();
     return writePage(*page, options, *file) && good;
 }
@@ -107,6 +108,11 @@ int runReport(const ReportOptions& options, DecoderLines& lines) {
         report(target.reason());
         return ExitStatus::BadInput;
     }
+    const Result<std::optional<MaskOptions>> masking = maskOptionsOf(options.mask);
+    if (!masking) {
+        report(masking.reason());
+        return ExitStatus::BadInput;
+    }
     std::optional<DecoderLog> log(std::in_place, lines); // of the decoders whose catalogues are made
     const AllCatalogues catalogues;
     log.reset();
@@ -118,7 +124,8 @@ int runReport(const ReportOptions& options, DecoderLines& lines) {
         good =
             good && std::find(options.rules.begin(), options.rules.end(), error.file) == options.rules.end();
     }
-    return good && makePage(options, rules, *target, lines) ? ExitStatus::Done : ExitStatus::BadInput;
+    return good && makePage(options, rules, *masking, *target, lines) ? ExitStatus::Done
+                                                                      : ExitStatus::BadInput;
 }
 
 } // namespace velmora

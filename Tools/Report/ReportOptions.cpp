@@ -33,16 +33,19 @@ CLI::App* addReport(CLI::App& app, ReportOptions& options) {
                       "Neither the built-in rules nor those in ~/.config/velmora/rules");
     addClock(*command, options.clock);
     addTechnology(*command, options.technology, "Decode as");
+    addMaskOption(*command, options.mask);
     command->footer(
         "The page needs no network and nothing beside itself: it can be mailed, printed, and read without\n"
-        "scripts. It holds what it shows as JSON, too. Cells and areas, and so places, are in it: mask the\n"
-        "recording first where they must not be.\n\n"
+        "scripts. It holds what it shows as JSON, too. Cells and areas, and so places, are in it\n"
+        "unless --mask=location is given.\n\n" +
+        std::string(maskHelp) +
+        "\n"
         "OUT is complete or does not exist, and is for its user alone (mode 0600). What cannot be read or\n"
         "decoded is reported, on the page as well, and gives exit status 1.\n\n"
         "Examples:\n"
         "  velmora-log report drive.pcapng -o drive.html\n"
         "  velmora-log report before.pcapng after.pcapng -o comparison.html\n"
-        "  velmora-log mask --level location drive.pcapng - | velmora-log report - -o shared.html");
+        "  velmora-log report --mask=location drive.pcapng -o shared.html");
     return command;
 }
 

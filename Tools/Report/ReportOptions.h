@@ -4,6 +4,7 @@
 #pragma once
 
 #include "Tools/Analysed/AnalysisClock.h"
+#include "Tools/Mask/MaskOption.h"
 
 #include <string>
 #include <vector>
@@ -21,6 +22,7 @@ struct ReportOptions {
     bool force = false;
     bool hasIdentities = false;
     AnalysisClock clock = AnalysisClock::Arrival;
+    MaskOption mask;
     std::vector<std::string> rules; ///< files of rules
     bool usesStandardRules = true;
     std::string technology; ///< overrides the files', or chooses one of several; empty for the files'

@@ -14,8 +14,10 @@ namespace velmora {
 
 namespace {
 
-constexpr std::array<std::string_view, TimeShares::classes + 1> classNames{"poor", "fair", "good",
-                                                                           "excellent", "not classified"};
+/// As the style and the table call it.
+std::string_view className(std::size_t index) {
+    return index == TimeShares::noClass ? "none" : nameOf(levelClasses[index]);
+}
 
 void writeInputs(Markup& out, const DriveReport& report) {
     beginTable(out, "Files", {"File", "#Messages", "First", "Last", "#Duration", "#Lost", "Read"});
@@ -76,10 +78,10 @@ void writeShares(Markup& out, const TechnologyReport& technology) {
             const bool isKnown = row != TimeShares::noTechnology;
             out.raw("<tr>");
             writeCell(out, isKnown ? nameOf(static_cast<RadioTechnology>(row)) : "not known");
-            writeCell(out, classNames[i]);
+            writeCell(out, i == TimeShares::noClass ? "not classified" : className(i));
             writeNumberCell(out, pageDuration(time));
             writeNumberCell(out, pageShare(time, whole));
-            writeBar(out, time, whole, i == TimeShares::noClass ? "none" : classNames[i]);
+            writeBar(out, time, whole, className(i));
             out.raw("</tr>\n");
         }
     endTable(out);

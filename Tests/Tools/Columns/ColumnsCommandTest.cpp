@@ -1,6 +1,7 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
+#include "PropertyLists/Dictionary.h"
 #include "Tests/Tools/SeveralTechnologies.h"
 
 #include <gmock/gmock.h>
@@ -63,6 +64,47 @@ TEST_F(ColumnsCommandTest, leavesAloneWhatIsThere) {
     writeDrive("copy.pcapng");
     EXPECT_EQ(columns({path("copy.pcapng")}), path("copy.pcapng") + ": there already\n");
     EXPECT_EQ(files(), before);
+}
+
+TEST_F(ColumnsCommandTest, masksWhatItWrites) {
+    constexpr const char* card = "8900101000000000017";
+    const auto sim = makeDictionary();
+    sim->set("kSimFile_ICCID", card);
+    writeRecording("anna.pcapng", "Ostrel_GSM", {{at(0), rrState(4)}, {at(500), extraRecord(0, Value(sim))}});
+    const auto hasCard = [this, card] {
+        for (const auto& [name, content] : files())
+            if (content.find(card) != content.npos)
+                return true;
+        return false;
+    };
+    static_cast<void>(columns({path("anna.pcapng")}));
+    ASSERT_TRUE(hasCard());
+    std::filesystem::remove_all(path("out"));
+    EXPECT_THAT(columns({"--mask", path("anna.pcapng")}), HasSubstr(": written: "));
+    EXPECT_FALSE(hasCard());
+    for (const auto& [name, content] : files())
+        EXPECT_THAT(content, testing::Not(HasSubstr(path("anna.pcapng")))) << name;
+}
+
+TEST_F(ColumnsCommandTest, countsMaskedTablesAsOthersThanUnmaskedOnes) {
+    writeDrive("drive.pcapng");
+    std::ofstream(path("fleet.key")) << std::string(64, '7') << "\n";
+    std::filesystem::permissions(path("fleet.key"), std::filesystem::perms::owner_read);
+    const auto masked = [this](const std::string& level) {
+        return columns({level, "--key", path("fleet.key"), path("drive.pcapng")});
+    };
+    static_cast<void>(columns({path("drive.pcapng")}));
+    const std::size_t unmasked = files().size();
+    EXPECT_THAT(masked("--mask"), HasSubstr(": written: "));
+    EXPECT_THAT(masked("--mask=all"), HasSubstr(": written: "));
+    EXPECT_EQ(files().size(), 3 * unmasked);
+    EXPECT_THAT(masked("--mask"), HasSubstr(": there already"));
+    EXPECT_THAT(masked("--mask=all"), HasSubstr(": there already"));
+    std::size_t moved = 0;
+    for (const auto& [name, content] : files())
+        moved += name.find("/date=2000-01-01/") != name.npos ? 1 : 0;
+    EXPECT_EQ(moved, unmasked);
+    EXPECT_EQ(run({"columns", "--mask", "--compact", path("out")}, 2), "");
 }
 
 TEST_F(ColumnsCommandTest, completesWhatWasInterrupted) {
