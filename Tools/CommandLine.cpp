@@ -110,6 +110,7 @@ CommandLine parseCommandLine(int count, const char* const* arguments) {
     commands.add(app, addRules);
     commands.add(app, addStats);
     commands.add(app, addDiff);
+    commands.add(app, addReport);
     commands.add(app, addMask);
     commands.add(app, addColumns);
 

@@ -14,6 +14,7 @@
 #include "Tools/Info/InfoOptions.h"
 #include "Tools/Mask/MaskCommandOptions.h"
 #include "Tools/Record/RecordOptions.h"
+#include "Tools/Report/ReportOptions.h"
 #include "Tools/Rules/RulesOptions.h"
 #include "Tools/Stats/StatsOptions.h"
 #include "Tools/Watch/WatchOptions.h"
@@ -37,7 +38,7 @@ struct CommandLine {
         false; ///< decoder lines as they arise, not summed up; those of objects made and destroyed too
     std::variant<Notice, DecodeOptions, WatchOptions, RecordOptions, ConvertOptions, InfoOptions,
                  FieldsOptions, EventsOptions, RulesOptions, StatsOptions, DiffOptions, MaskCommandOptions,
-                 ColumnsOptions>
+                 ColumnsOptions, ReportOptions>
         command;
 };
 

@@ -21,6 +21,7 @@
 #include "Tools/Output.h"
 #include "Tools/Record/RecordCommand.h"
 #include "Tools/Report.h"
+#include "Tools/Report/ReportCommand.h"
 #include "Tools/Rules/RulesCommand.h"
 #include "Tools/Stats/StatsCommand.h"
 #include "Tools/Watch/WatchCommand.h"
@@ -58,6 +59,8 @@ int run(const CommandLine& line, DecoderLines& lines, Output& output) {
         return runStats(*stats, lines, output);
     if (const auto* diff = std::get_if<DiffOptions>(&line.command))
         return runDiff(*diff, lines, output);
+    if (const auto* page = std::get_if<ReportOptions>(&line.command))
+        return runReport(*page, lines);
     const DecoderLog log(lines);
     if (const auto* info = std::get_if<InfoOptions>(&line.command))
         return runInfo(*info, output);

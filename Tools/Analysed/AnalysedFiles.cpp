@@ -41,6 +41,8 @@ bool analyseFile(std::uint32_t index, const AnalysedInput& input, std::optional<
     if (!reader) {
         report(title + ": " + reader.reason());
         feed.reportLoss({{index, 1}, reader.reason()});
+        if (input.fails)
+            input.fails(index, reader.reason());
         return false;
     }
     if (input.showsProgress)
@@ -69,8 +71,13 @@ bool analyseFile(std::uint32_t index, const AnalysedInput& input, std::optional<
     clearProgress();
     if (masking && masked.shift())
         masking->shift = masked.shift();
-    if (!analysed)
+    if (input.endsFile)
+        input.endsFile(index, masked.reader());
+    if (!analysed) {
         report(title + ": " + analysed.reason());
+        if (input.fails)
+            input.fails(index, analysed.reason());
+    }
     const bool allDecoded = analysed && messages.undecoded().report(title);
     const bool whole = reportLosses(**reader, title);
     sumUp();
