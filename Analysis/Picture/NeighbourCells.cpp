@@ -6,9 +6,29 @@
 #include "Analysis/Picture/PhysicalCell.h"
 
 #include <algorithm>
-#include <tuple>
+#include <bit>
+#include <limits>
 
 namespace velmora {
+
+namespace {
+
+constexpr double noLevel = -std::numeric_limits<double>::infinity();
+
+/// Both have a channel and a physical cell.
+bool areSame(const Neighbour& one, const Neighbour& other) {
+    return *one.channel == *other.channel && *one.physicalCell == *other.physicalCell &&
+           one.technology == other.technology;
+}
+
+std::size_t hashOf(const Neighbour& cell) {
+    // Of a whole number as small as these, the upper half holds all digits. Adding 0 makes 0 of -0.
+    const std::uint64_t channel = std::bit_cast<std::uint64_t>(*cell.channel + 0.0) >> 32;
+    const std::uint64_t physicalCell = std::bit_cast<std::uint64_t>(*cell.physicalCell + 0.0) >> 32;
+    return static_cast<std::size_t>((channel * 0x9E3779B97F4A7C15 + physicalCell * 0xC2B2AE3D27D4EB4F) >> 32);
+}
+
+} // namespace
 
 void NeighbourCells::add(const Observation& observation, const LeafUse& use, const MessageReport& report,
                          const TechnologyTable& table) {
@@ -24,7 +44,7 @@ void NeighbourCells::add(const Observation& observation, const LeafUse& use, con
         return;
     if (_new.empty() || _row.list != use.list || _row.number != observation.rows.back()) {
         _row = {use.list, observation.rows.back()};
-        Cell& cell = _new.emplace_back();
+        NewCell& cell = _new.emplace_back();
         cell.list = use.list;
         cell.neighbour.time = report.time;
         cell.neighbour.message = report.message;
@@ -32,7 +52,7 @@ void NeighbourCells::add(const Observation& observation, const LeafUse& use, con
         if (use.side != commonSide)
             cell.neighbour.technology = static_cast<RadioTechnology>(use.side);
     }
-    Cell& cell = _new.back();
+    NewCell& cell = _new.back();
     switch (use.role) {
     case Role::NeighbourChannel: cell.neighbour.channel = number; break;
     case Role::NeighbourPhysicalCell: cell.neighbour.physicalCell = physicalCellOf(observation); break;
@@ -48,61 +68,70 @@ void NeighbourCells::add(const Observation& observation, const LeafUse& use, con
     }
 }
 
-void NeighbourCells::removeReplaced(Time now) {
-    const auto isGone = [this, now](const Cell& cell) {
-        if (now - cell.neighbour.time > lifetime)
+bool NeighbourCells::isReplaced(const Neighbour& cell, const CatalogueNode* list, Time now) const {
+    if (now - cell.time > lifetime)
+        return true;
+    const bool isOnChannel = _channel && cell.channel == _channel;
+    if (std::find(_replaced.begin(), _replaced.end(), list) == _replaced.end())
+        return isOnChannel && !_replaced.empty(); // by the report of the phone's other mode
+    return !_channel || !cell.channel || isOnChannel;
+}
+
+void NeighbourCells::beginSeen(std::size_t cells) {
+    _seen.assign(std::bit_ceil(2 * cells + 1), 0);
+}
+
+bool NeighbourCells::wasSeen(std::uint32_t order) {
+    const Neighbour& cell = at(order);
+    if (!cell.channel || !cell.physicalCell)
+        return false;
+    const std::size_t mask = _seen.size() - 1;
+    std::size_t slot = hashOf(cell) & mask;
+    for (; _seen[slot] != 0; slot = (slot + 1) & mask)
+        if (areSame(at(_seen[slot] - 1), cell))
             return true;
-        const bool isOnChannel = _channel && cell.neighbour.channel == _channel;
-        if (std::find(_replaced.begin(), _replaced.end(), cell.list) == _replaced.end())
-            return isOnChannel && !_replaced.empty(); // by the report of the phone's other mode
-        return !_channel || !cell.neighbour.channel || isOnChannel;
-    };
-    std::erase_if(_kept, isGone);
+    _seen[slot] = order + 1;
+    return false;
 }
 
 /// A cell that several lists have, or one list has twice, is one neighbour: that of the latest report.
-void NeighbourCells::removeRepeated() {
-    const auto identity = [](const Cell& cell) {
-        return std::tie(cell.neighbour.technology, cell.neighbour.channel, cell.neighbour.physicalCell);
-    };
-    // Not std::stable_sort, which allocates.
-    for (std::size_t i = 0; i < _kept.size(); ++i)
-        _kept[i].order = i;
-    std::sort(_kept.begin(), _kept.end(), [&](const Cell& one, const Cell& other) {
-        return std::tuple_cat(identity(one), std::tie(other.order)) <
-               std::tuple_cat(identity(other), std::tie(one.order));
+void NeighbourCells::rank(Time now) {
+    _ranks.clear();
+    const std::size_t kept = _cells.size();
+    const auto all = static_cast<std::uint32_t>(kept + _new.size());
+    beginSeen(all);
+    for (std::uint32_t order = all; order-- > 0;) {
+        const Neighbour& cell = at(order);
+        const bool isOut = order < kept ? isReplaced(cell, _lists[order], now) : _new[order - kept].isServing;
+        if (!isOut && !wasSeen(order))
+            _ranks.push_back({cell.level_dBm.value_or(noLevel), order});
+    }
+    std::sort(_ranks.begin(), _ranks.end(), [](const Rank& one, const Rank& other) {
+        return one.level != other.level ? one.level > other.level : one.order < other.order;
     });
-    const auto isRepeated = [&](const Cell& one, const Cell& other) {
-        return one.neighbour.channel && one.neighbour.physicalCell && identity(one) == identity(other);
-    };
-    _kept.erase(std::unique(_kept.begin(), _kept.end(), isRepeated), _kept.end());
+    if (_ranks.size() > most)
+        _ranks.resize(most);
 }
 
 bool NeighbourCells::endMessage(Time now) {
-    if (_replaced.empty() && _new.empty()) {
-        const auto isOld = [now](const Neighbour& cell) { return now - cell.time > lifetime; };
-        if (std::none_of(_cells.begin(), _cells.end(), isOld))
-            return false;
-    }
-    removeReplaced(now);
-    _replaced.clear();
-    for (Cell& cell : _new) {
-        if (cell.isServing)
-            continue;
+    const bool hasOld = !_cells.empty() && now - _oldest > lifetime;
+    if (_replaced.empty() && _new.empty() && !hasOld)
+        return false;
+    for (NewCell& cell : _new)
         if (!cell.neighbour.channel)
             cell.neighbour.channel = _channel;
-        _kept.push_back(cell);
+    rank(now);
+    _replaced.clear();
+    _nextCells.clear();
+    _nextLists.clear();
+    _oldest = Time::max();
+    for (const Rank& each : _ranks) {
+        _nextCells.push_back(at(each.order));
+        _nextLists.push_back(listOf(each.order));
+        _oldest = std::min(_oldest, _nextCells.back().time);
     }
-    removeRepeated();
-    std::sort(_kept.begin(), _kept.end(), [](const Cell& one, const Cell& other) {
-        return std::tie(one.neighbour.level_dBm, other.order) >
-               std::tie(other.neighbour.level_dBm, one.order);
-    });
-    if (_kept.size() > most)
-        _kept.resize(most);
-    _cells.clear();
-    for (const Cell& cell : _kept)
-        _cells.push_back(cell.neighbour);
+    _cells.swap(_nextCells);
+    _lists.swap(_nextLists);
     return true;
 }
 

@@ -33,32 +33,54 @@ public:
     /// All has been added. Whether anything changed.
     bool endMessage(Time now);
     /// Those of earlier messages.
-    void forgetAll() { _kept.clear(), _cells.clear(); }
+    void forgetAll() { _cells.clear(), _lists.clear(), _oldest = Time::max(); }
 
     /// The strongest first; those without a level last.
     [[nodiscard]] std::span<const Neighbour> cells() const { return _cells; }
 
 private:
-    struct Cell {
+    struct NewCell {
         Neighbour neighbour;
         const CatalogueNode* list;
         bool isServing = false; ///< and no neighbour
-        std::size_t order = 0;  ///< in which it was reported
     };
     struct Row {
         const CatalogueNode* list = nullptr;
         std::uint32_t number = 0;
     };
+    /// A cell's place in the order of levels. Cells are large: their ranks are sorted instead.
+    struct Rank {
+        double level;        ///< that of a cell without one is below all others
+        std::uint32_t order; ///< of the report: the kept cells, then the new ones
+    };
 
-    void removeReplaced(Time now);
-    void removeRepeated();
+    [[nodiscard]] bool isReplaced(const Neighbour& cell, const CatalogueNode* list, Time now) const;
+    /// The cell of that order.
+    [[nodiscard]] const Neighbour& at(std::uint32_t order) const {
+        return order < _cells.size() ? _cells[order] : _new[order - _cells.size()].neighbour;
+    }
+    [[nodiscard]] const CatalogueNode* listOf(std::uint32_t order) const {
+        return order < _lists.size() ? _lists[order] : _new[order - _lists.size()].list;
+    }
+    /// Ranks the cells that stay and the new ones.
+    void rank(Time now);
+    /// Whether a cell of the same identity has been seen since `beginSeen`; it has from now on.
+    [[nodiscard]] bool wasSeen(std::uint32_t order);
+    void beginSeen(std::size_t cells);
 
-    std::vector<Cell> _kept;
-    std::vector<Cell> _new;                      ///< of this message
+    std::vector<Neighbour> _cells;               ///< in the order of their levels
+    std::vector<const CatalogueNode*> _lists;    ///< that each of them is of
+    Time _oldest = Time::max();                  ///< of the cells
+    std::vector<NewCell> _new;                   ///< of this message
     std::vector<const CatalogueNode*> _replaced; ///< by this message
-    std::vector<Neighbour> _cells;               ///< the kept ones, in order
     std::optional<double> _channel;              ///< of this message's cells that have none
     Row _row;                                    ///< of the latest one in `_new`
+
+    // Storage that is used again:
+    std::vector<Rank> _ranks;
+    std::vector<std::uint32_t> _seen; ///< a hash table of cells by their order, plus 1
+    std::vector<Neighbour> _nextCells;
+    std::vector<const CatalogueNode*> _nextLists;
 };
 
 } // namespace velmora

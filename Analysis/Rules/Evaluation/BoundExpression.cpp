@@ -26,7 +26,7 @@ bool isAnyTouched(std::span<const std::uint32_t> slots, const InputStore& inputs
 } // namespace
 
 BoundExpression::BoundExpression(const Expression& expression, InputStore& inputs)
-    : _expression(&expression), _windowValues(expression.windows.size()) {
+    : _expression(&expression), _windowValues(expression.windows.size()), _columns(expression) {
     for (const RuleInput& each : expression.inputs)
         _slots.push_back(inputs.add(each));
     for (const ExpressionWindow& each : expression.windows) {
@@ -43,7 +43,7 @@ RuleValue BoundExpression::evaluate(const InputStore& inputs, Wakeup& wakeup) {
             updateDelta(i, inputs, wakeup);
         else
             updateCount(i, inputs, wakeup);
-    return Evaluator(*_expression, _slots, inputs, _windowValues, wakeup).value();
+    return Evaluator(*_expression, _slots, inputs, _windowValues, _columns, wakeup).value();
 }
 
 void BoundExpression::clear() {
@@ -86,7 +86,7 @@ void BoundExpression::updateCount(std::size_t index, const InputStore& inputs, W
     Window& window = _windows[index];
     if (isAnyTouched(window.slots, inputs)) {
         const std::uint32_t operand = _expression->nodes[_expression->windows[index].node].first;
-        Evaluator evaluator(*_expression, _slots, inputs, _windowValues, wakeup);
+        Evaluator evaluator(*_expression, _slots, inputs, _windowValues, _columns, wakeup);
         if (evaluator.evaluate(operand).isTrue()) {
             if (window.samples.size() == mostSamples)
                 window.samples.pop_front();

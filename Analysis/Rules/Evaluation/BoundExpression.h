@@ -3,6 +3,7 @@
 
 #pragma once
 
+#include "Analysis/Rules/Evaluation/ColumnEvaluator.h"
 #include "Analysis/Rules/Evaluation/InputStore.h"
 #include "Analysis/Rules/Evaluation/RuleValue.h"
 #include "Analysis/Rules/Evaluation/Wakeup.h"
@@ -47,6 +48,7 @@ private:
     std::vector<std::uint32_t> _slots; ///< by input of the expression
     std::vector<Window> _windows;
     std::vector<RuleValue> _windowValues;
+    ColumnEvaluator _columns;
 };
 
 } // namespace velmora

@@ -3,6 +3,8 @@
 
 #include "Analysis/Rules/Evaluation/Evaluator.h"
 
+#include "Analysis/Rules/Evaluation/NumberOperations.h"
+
 #include <algorithm>
 #include <chrono>
 #include <cmath>
@@ -13,6 +15,16 @@ namespace {
 
 using Operation = ExpressionNode::Operation;
 
+double combine(Operation operation, double first, double second) {
+    double result = unknownNumber;
+    withBinaryOperation(operation, [&](auto function) { result = function(first, second); });
+    return result;
+}
+
+double numberOf(const RuleValue& value) {
+    return value.hasNumber ? value.number : unknownNumber;
+}
+
 double inSeconds(Time::duration span) {
     return std::chrono::duration<double>(span).count();
 }
@@ -22,14 +34,20 @@ double inSeconds(Time::duration span) {
 RuleValue Evaluator::evaluate(std::uint32_t index) {
     const ExpressionNode& node = _expression.nodes[index];
     switch (node.operation) {
-    case Operation::Number: return RuleValue::of(node.number);
     case Operation::Text: return RuleValue::of(std::string_view(node.text));
-    case Operation::Truth: return RuleValue::truth(node.number != 0);
     case Operation::Input: return inputValue(node.input);
-    case Operation::Not: {
-        const RuleValue operand = evaluate(node.first);
-        return operand.isKnown() ? RuleValue::truth(operand.isFalse()) : operand;
+    default: return RuleValue::of(number(index));
     }
+}
+
+double Evaluator::number(std::uint32_t index) {
+    const ExpressionNode& node = _expression.nodes[index];
+    switch (node.operation) {
+    case Operation::Number: return finiteNumber(node.number);
+    case Operation::Text: return unknownNumber;
+    case Operation::Truth: return truthNumber(node.number != 0);
+    case Operation::Input: return inputNumber(node.input);
+    case Operation::Not: return negation(number(node.first));
     case Operation::And:
     case Operation::Or: return connect(node);
     case Operation::In: return isAmong(node);
@@ -40,17 +58,17 @@ RuleValue Evaluator::evaluate(std::uint32_t index) {
     case Operation::Greater:
     case Operation::GreaterOrEqual: return compare(node);
     case Operation::Age: _wakeup.atNextMessage = true; return age(node);
-    case Operation::Known: return RuleValue::truth(inputValue(node.input).isKnown());
+    case Operation::Known: return truthNumber(inputValue(node.input).isKnown());
     case Operation::Changed: {
         const InputCell* const found = cell(node.input);
         if (!found || !found->isKnown())
-            return RuleValue::unknown();
+            return unknownNumber;
         const bool isNow = found->turn == _inputs.turn() && found->hasChanged;
         _wakeup.atNextMessage = _wakeup.atNextMessage || isNow;
-        return RuleValue::truth(isNow);
+        return truthNumber(isNow);
     }
     case Operation::Delta:
-    case Operation::CountInWindow: return _windows[node.window];
+    case Operation::CountInWindow: return numberOf(_windows[node.window]);
     case Operation::CountEach:
     case Operation::Any:
     case Operation::All:
@@ -60,45 +78,47 @@ RuleValue Evaluator::evaluate(std::uint32_t index) {
     }
 }
 
-RuleValue Evaluator::connect(const ExpressionNode& node) {
+double Evaluator::connect(const ExpressionNode& node) {
     const bool decisive = node.operation == Operation::Or;
-    const RuleValue first = evaluate(node.first);
+    const double first = number(node.first);
     // The other one cannot change the value before this one does.
-    if (first.isKnown() && first.isTrue() == decisive)
+    if (isKnownNumber(first) && (first != 0) == decisive)
         return first;
-    const RuleValue second = evaluate(node.second);
-    if (second.isKnown() && second.isTrue() == decisive)
+    const double second = number(node.second);
+    if (isKnownNumber(second) && (second != 0) == decisive)
         return second;
-    return first.isKnown() ? second : first;
+    return isKnownNumber(first) ? second : first;
 }
 
-RuleValue Evaluator::compare(const ExpressionNode& node) {
+double Evaluator::compare(const ExpressionNode& node) {
     const ExpressionNode& first = _expression.nodes[node.first];
     const ExpressionNode& second = _expression.nodes[node.second];
+    const bool asksEqual = node.operation == Operation::Equal || node.operation == Operation::Unequal;
+    if (asksEqual && mayBeText(first) && mayBeText(second)) {
+        const RuleValue left = evaluate(node.first);
+        const RuleValue right = evaluate(node.second);
+        if (left.hasText && right.hasText)
+            return truthNumber((left.text == right.text) == (node.operation == Operation::Equal));
+        return combine(node.operation, numberOf(left), numberOf(right));
+    }
     const bool isAgeFirst = first.operation == Operation::Age && second.operation == Operation::Number;
     const bool isAgeSecond = second.operation == Operation::Age && first.operation == Operation::Number;
-    const RuleValue left = isAgeFirst ? age(first) : evaluate(node.first);
-    const RuleValue right = isAgeSecond ? age(second) : evaluate(node.second);
+    const double left = isAgeFirst ? age(first) : number(node.first);
+    const double right = isAgeSecond ? age(second) : number(node.second);
     if (isAgeFirst)
         wakeForAge(first, second);
     if (isAgeSecond)
         wakeForAge(second, first);
-    const bool asksEqual = node.operation == Operation::Equal || node.operation == Operation::Unequal;
-    if (asksEqual && left.hasText && right.hasText)
-        return RuleValue::truth((left.text == right.text) == (node.operation == Operation::Equal));
-    if (!left.hasNumber || !right.hasNumber)
-        return RuleValue::unknown();
-    switch (node.operation) {
-    case Operation::Equal: return RuleValue::truth(left.number == right.number);
-    case Operation::Unequal: return RuleValue::truth(left.number != right.number);
-    case Operation::Less: return RuleValue::truth(left.number < right.number);
-    case Operation::LessOrEqual: return RuleValue::truth(left.number <= right.number);
-    case Operation::Greater: return RuleValue::truth(left.number > right.number);
-    default: return RuleValue::truth(left.number >= right.number);
-    }
+    return combine(node.operation, left, right);
 }
 
-RuleValue Evaluator::isAmong(const ExpressionNode& node) {
+bool Evaluator::mayBeText(const ExpressionNode& node) const {
+    return node.operation == Operation::Text ||
+           (node.operation == Operation::Input &&
+            _expression.inputs[node.input].kind != RuleInput::Kind::EachNeighbour);
+}
+
+double Evaluator::isAmong(const ExpressionNode& node) {
     const RuleValue left = evaluate(node.first);
     bool isComparable = false;
     for (std::uint32_t i = 0; i < node.choiceCount; ++i) {
@@ -108,36 +128,27 @@ RuleValue Evaluator::isAmong(const ExpressionNode& node) {
         isComparable = true;
         if (choice.isText ? left.text == choice.text
                           : left.number >= choice.lowest && left.number <= choice.highest)
-            return RuleValue::truth(true);
+            return truthNumber(true);
     }
-    return isComparable ? RuleValue::truth(false) : RuleValue::unknown();
+    return isComparable ? truthNumber(false) : unknownNumber;
 }
 
-RuleValue Evaluator::compute(const ExpressionNode& node) {
-    const RuleValue first = evaluate(node.first);
-    if (!first.hasNumber)
-        return RuleValue::unknown();
+double Evaluator::compute(const ExpressionNode& node) {
+    const double first = number(node.first);
+    if (!isKnownNumber(first))
+        return first;
     if (node.operation == Operation::Negate)
-        return RuleValue::of(-first.number);
+        return -first;
     if (node.operation == Operation::Absolute)
-        return RuleValue::of(std::abs(first.number));
-    const RuleValue second = evaluate(node.second);
-    if (!second.hasNumber)
-        return RuleValue::unknown();
-    switch (node.operation) {
-    case Operation::Add: return RuleValue::of(first.number + second.number);
-    case Operation::Subtract: return RuleValue::of(first.number - second.number);
-    case Operation::Multiply: return RuleValue::of(first.number * second.number);
-    default: return RuleValue::of(first.number / second.number);
-    }
+        return std::abs(first);
+    return combine(node.operation, first, number(node.second));
 }
 
-RuleValue Evaluator::age(const ExpressionNode& node) const {
+double Evaluator::age(const ExpressionNode& node) const {
     if (_expression.inputs[node.input].kind == RuleInput::Kind::EachNeighbour)
-        return RuleValue::of(inSeconds(_inputs.now() - _neighbour->time));
+        return inSeconds(_inputs.now() - _neighbour->time);
     const InputCell* const found = cell(node.input);
-    return found && found->isKnown() ? RuleValue::of(inSeconds(_inputs.now() - found->time))
-                                     : RuleValue::unknown();
+    return found && found->isKnown() ? inSeconds(_inputs.now() - found->time) : unknownNumber;
 }
 
 void Evaluator::wakeForAge(const ExpressionNode& age, const ExpressionNode& other) {
@@ -169,9 +180,14 @@ bool Evaluator::forEach(const ExpressionNode& node, Each each) {
         }
     bool hasAny = false;
     if (_expression.inputs[input].kind == RuleInput::Kind::EachNeighbour) {
+        if (_columns.canEvaluate(node)) {
+            const std::span<const double> values = _columns.evaluate(node, _inputs.neighbourColumns(), *this);
+            std::for_each(values.begin(), values.end(), each);
+            return !values.empty();
+        }
         for (const Neighbour& neighbour : _inputs.neighbours()) {
             _neighbour = &neighbour;
-            each(evaluate(node.first));
+            each(number(node.first));
             hasAny = true;
         }
         _neighbour = nullptr;
@@ -179,33 +195,35 @@ bool Evaluator::forEach(const ExpressionNode& node, Each each) {
     }
     for (const InputCell& row : _inputs.slot(_slots[input]).cells) {
         _row = &row;
-        each(evaluate(node.first));
+        each(number(node.first));
         hasAny = true;
     }
     _row = nullptr;
     return hasAny;
 }
 
-RuleValue Evaluator::goThrough(const ExpressionNode& node) {
+double Evaluator::goThrough(const ExpressionNode& node) {
     double count = 0;
     bool hasUnknown = false;
     bool hasFalse = false;
-    RuleValue most;
-    const bool hasAny = forEach(node, [&](const RuleValue& value) {
-        hasUnknown = hasUnknown || !value.isKnown();
-        hasFalse = hasFalse || value.isFalse();
-        count += value.isTrue() ? 1 : 0;
-        if (value.hasNumber &&
-            (!most.hasNumber || (node.operation == Operation::Minimum ? value.number < most.number
-                                                                      : value.number > most.number)))
-            most = RuleValue::of(value.number);
+    double most = unknownNumber;
+    const bool isLeast = node.operation == Operation::Minimum;
+    const bool hasAny = forEach(node, [&](double value) {
+        if (!isKnownNumber(value)) {
+            hasUnknown = true;
+            return;
+        }
+        hasFalse = hasFalse || value == 0;
+        count += value != 0 ? 1 : 0;
+        if (!isKnownNumber(most) || (isLeast ? value < most : value > most))
+            most = value;
     });
     if (!hasAny)
-        return RuleValue::unknown();
+        return unknownNumber;
     switch (node.operation) {
-    case Operation::CountEach: return RuleValue::of(count);
-    case Operation::Any: return count > 0 || !hasUnknown ? RuleValue::truth(count > 0) : RuleValue::unknown();
-    case Operation::All: return hasFalse || !hasUnknown ? RuleValue::truth(!hasFalse) : RuleValue::unknown();
+    case Operation::CountEach: return count;
+    case Operation::Any: return count > 0 || !hasUnknown ? truthNumber(count > 0) : unknownNumber;
+    case Operation::All: return hasFalse || !hasUnknown ? truthNumber(!hasFalse) : unknownNumber;
     default: return most;
     }
 }
@@ -222,12 +240,25 @@ const InputCell* Evaluator::cell(std::uint32_t input) const {
     return found == cells.end() ? nullptr : &*found;
 }
 
+double Evaluator::inputNumber(std::uint32_t input) const {
+    const RuleInput& read = _expression.inputs[input];
+    if (read.kind == RuleInput::Kind::EachNeighbour)
+        return NeighbourColumns::valueOf(*_neighbour, read.role);
+    const InputCell* const found = cell(input);
+    if (!found)
+        return unknownNumber;
+    switch (found->kind) {
+    case ObservedKind::Number:
+    case ObservedKind::Flag:
+    case ObservedKind::Enumeration: return finiteNumber(found->number);
+    default: return unknownNumber;
+    }
+}
+
 RuleValue Evaluator::inputValue(std::uint32_t input) const {
     const RuleInput& read = _expression.inputs[input];
-    if (read.kind == RuleInput::Kind::EachNeighbour) {
-        const ReportedValue value = valueOf(*_neighbour, read.role);
-        return value.kind == ObservedKind::Absent ? RuleValue::unknown() : RuleValue::of(value.number);
-    }
+    if (read.kind == RuleInput::Kind::EachNeighbour)
+        return RuleValue::of(NeighbourColumns::valueOf(*_neighbour, read.role));
     const InputCell* const found = cell(input);
     if (!found)
         return RuleValue::unknown();

@@ -81,6 +81,7 @@ bool InputStore::isReported(std::uint32_t slot) const {
 
 void InputStore::setNeighbours(std::span<const Neighbour> neighbours) {
     _neighbours.assign(neighbours.begin(), neighbours.end());
+    _neighbourColumns.set(neighbours);
     for (std::uint32_t i = 0; i < _slots.size(); ++i) {
         const RuleInput& input = _slots[i].input;
         if (input.kind == RuleInput::Kind::EachNeighbour)
@@ -94,6 +95,7 @@ void InputStore::clear() {
     for (Slot& slot : _slots)
         slot.cells.clear();
     _neighbours.clear();
+    _neighbourColumns.clear();
     _touched.clear();
 }
 

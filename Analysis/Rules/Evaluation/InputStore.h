@@ -5,6 +5,7 @@
 
 #include "Analysis/MessageReport.h"
 #include "Analysis/Picture/RadioPicture.h"
+#include "Analysis/Rules/Evaluation/NeighbourColumns.h"
 #include "Analysis/Rules/Expression/RuleInput.h"
 #include "LogGenerator/Observations/Catalogue.h"
 #include "Platform/Clock.h"
@@ -70,6 +71,7 @@ public:
 
     void setNeighbours(std::span<const Neighbour> neighbours);
     [[nodiscard]] std::span<const Neighbour> neighbours() const { return _neighbours; }
+    [[nodiscard]] const NeighbourColumns& neighbourColumns() const { return _neighbourColumns; }
 
     /// Nothing is known any more.
     void clear();
@@ -81,6 +83,7 @@ private:
 
     std::vector<Slot> _slots;
     std::vector<Neighbour> _neighbours;
+    NeighbourColumns _neighbourColumns; ///< of the same
     std::vector<std::uint32_t> _touched;
     std::uint64_t _turn = 0;
     MessageNumber _message;
