@@ -6,9 +6,9 @@
 #include "Platform/Linux/Files/FileDescriptor.h"
 #include "Recording/OpenMessages.h"
 #include "Recording/Pcapng/PcapngWriter.h"
+#include "Recording/Refreshes/RefreshTicks.h"
 #include "Tests/Recording/FakeRecordingFile.h"
 #include "Tests/Recording/PcapngFile.h"
-#include "Tools/Decode/RefreshTicks.h"
 #include "Tools/Report.h"
 
 #include <memory>

@@ -9,12 +9,12 @@
 #include "Platform/TelephonyService.h"
 #include "PropertyLists/PropertyList.h"
 #include "Recording/OpenMessages.h"
+#include "Recording/Refreshes/RefreshTicks.h"
 #include "Telephony/Drives/ScenarioRegistry.h"
 #include "Tests/Support/FakeClock.h"
 #include "Tests/Tools/FakeLogService.h"
 #include "Tests/Tools/ToolFixture.h"
 #include "Tools/Decode/Decoding.h"
-#include "Tools/Decode/RefreshTicks.h"
 #include "Tools/Report.h"
 
 #include <gmock/gmock.h>

@@ -9,9 +9,9 @@
 #include "Platform/Result.h"
 #include "PropertyLists/Value.h"
 #include "Recording/MessageReader.h"
+#include "Recording/Refreshes/RefreshTicks.h"
 #include "Tools/Analysed/AnalysisClock.h"
 #include "Tools/Analysed/MessageAnalysis.h"
-#include "Tools/Decode/RefreshTicks.h"
 #include "Tools/Decode/UndecodedMessages.h"
 
 #include <cstdint>

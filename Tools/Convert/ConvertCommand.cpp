@@ -7,7 +7,7 @@
 #include "Recording/OpenMessages.h"
 #include "Tools/Convert/Conversion.h"
 #include "Tools/Decode/Decoding.h"
-#include "Tools/Decode/Refreshes.h"
+#include "Tools/Decode/RefreshCount.h"
 #include "Tools/ExitStatus.h"
 #include "Tools/Messages/TechnologyChoice.h"
 #include "Tools/OutputGuard.h"

@@ -7,9 +7,9 @@
 #include "LogGenerator/GSM/AssertionFailure.h"
 #include "LogGenerator/LogGenerator.h"
 #include "PropertyLists/Value.h"
+#include "Recording/Refreshes/RefreshTicks.h"
+#include "Recording/Refreshes/Refreshes.h"
 #include "Tools/Decode/Decoding.h"
-#include "Tools/Decode/RefreshTicks.h"
-#include "Tools/Decode/Refreshes.h"
 #include "Tools/Messages/MessageSelection.h"
 
 #include <functional>

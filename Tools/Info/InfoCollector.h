@@ -6,7 +6,7 @@
 #include "LogGenerator/Extra/PayloadCache.h"
 #include "LogGenerator/LogGenerator.h"
 #include "PropertyLists/Value.h"
-#include "Tools/Decode/RefreshTicks.h"
+#include "Recording/Refreshes/RefreshTicks.h"
 #include "Tools/Info/FileInfo.h"
 #include "Tools/Messages/TechnologyChoice.h"
 

@@ -1,7 +1,9 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Tools/Decode/Refreshes.h"
+#include "Tools/Decode/RefreshCount.h"
+
+#include "Recording/Refreshes/Refreshes.h"
 
 namespace velmora {
 

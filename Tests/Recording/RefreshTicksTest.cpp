@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Tools/Decode/RefreshTicks.h"
+#include "Recording/Refreshes/RefreshTicks.h"
 
 #include <gtest/gtest.h>
 

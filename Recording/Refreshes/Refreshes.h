@@ -5,8 +5,7 @@
 
 #include "Platform/Clock.h"
 #include "Recording/MessageReader.h"
-#include "Tools/Decode/RefreshTicks.h"
-#include "Tools/Messages/MessageSelection.h"
+#include "Recording/Refreshes/RefreshTicks.h"
 
 #include <cstdint>
 #include <optional>
@@ -54,10 +53,5 @@ private:
     bool _isPending = false;        ///< a message has been decoded since the last refresh
     std::uint64_t _count = 0;
 };
-
-/// How many refreshes decoding the selected messages of a file takes, of which nothing has been read: those
-/// of its technology, or of the one of that index.
-[[nodiscard]] std::uint64_t countRefreshes(MessageReader& reader, const MessageSelection& messages,
-                                           std::optional<std::uint32_t> technology);
 
 } // namespace velmora
