@@ -49,6 +49,7 @@ void LogGenerator::setObservationSink(ObservationSink* sink) {
         static_cast<void>(catalogue());
         if (!_observer)
             _observer = std::make_unique<Observer>();
+        _observer->setWanted(WantedLeaves(*sink));
         _observer->assumeAllShown();
     }
     observe(observer());

@@ -246,8 +246,11 @@ void OstrelLogGenerator2::describeSection(const Base& section, const Place& plac
 void OstrelLogGenerator2::observe(Observer* observer) {
     for (const auto& [name, section] : cIndex->classDict) {
         const auto map = _fieldMaps.find(section);
-        if (map != _fieldMaps.end())
-            section->observe(observer, &map->second);
+        if (map == _fieldMaps.end())
+            continue;
+        if (observer)
+            map->second.setWanted(observer->wanted());
+        section->observe(observer, &map->second);
     }
 }
 

@@ -56,19 +56,31 @@ ContextsDetector::Context& ContextsDetector::at(std::uint32_t row) {
     return context;
 }
 
+std::size_t ContextsDetector::parts() const {
+    return firstAddress + _table.addresses.size();
+}
+
+bool ContextsDetector::isOfPart(std::string_view path, std::size_t part) const {
+    return std::any_of(_table.lists.begin(), _table.lists.end(), [&](std::string_view list) {
+        const std::string_view label = labelIn(path, list);
+        if (label.empty())
+            return false;
+        if (part == key || part == connected)
+            return label == (part == key ? _table.key : _table.connected);
+        return label == _table.addresses[part - firstAddress];
+    });
+}
+
+bool ContextsDetector::wants(const CatalogueField& leaf) const {
+    for (std::size_t part = 0; part < parts(); ++part)
+        if (isOfPart(leaf.path, part))
+            return true;
+    return false;
+}
+
 void ContextsDetector::read(const Observation& observation) {
-    const auto isOfPart = [this](std::string_view path, std::size_t part) {
-        return std::any_of(_table.lists.begin(), _table.lists.end(), [&](std::string_view list) {
-            const std::string_view label = labelIn(path, list);
-            if (label.empty())
-                return false;
-            if (part == key || part == connected)
-                return label == (part == key ? _table.key : _table.connected);
-            return label == _table.addresses[part - firstAddress];
-        });
-    };
-    for (const std::uint8_t part :
-         _leaves.of(*observation.leaf, firstAddress + _table.addresses.size(), isOfPart)) {
+    const auto isOf = [this](std::string_view path, std::size_t part) { return isOfPart(path, part); };
+    for (const std::uint8_t part : _leaves.of(*observation.leaf, parts(), isOf)) {
         if (observation.rows.empty() || observation.kind == ObservedKind::Absent || _count > most)
             continue;
         Context& context = at(observation.rows.front());

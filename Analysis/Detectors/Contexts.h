@@ -23,6 +23,7 @@ public:
     ContextsDetector(const Catalogue& catalogue, const DetectorTable& table)
         : _table(table.contexts), _leaves(catalogue) {}
 
+    [[nodiscard]] bool wants(const CatalogueField& leaf) const override;
     void report(const MessageReport& report, const RadioPicture& picture, EventSink& sink) override;
     void interrupt(Time last, EventSink& sink) override;
 
@@ -44,7 +45,9 @@ private:
     void compare(const MessageReport& report, const RadioPicture& picture, EventSink& sink);
     void happened(EventKind kind, const Context& context, const MessageReport& report,
                   const RadioPicture& picture, EventSink& sink) const;
-    [[nodiscard]] std::vector<std::string> pathsOf(std::string_view label) const;
+    /// How many parts of a context the table has, and whether leaves of that path are one of them.
+    [[nodiscard]] std::size_t parts() const;
+    [[nodiscard]] bool isOfPart(std::string_view path, std::size_t part) const;
 
     ContextTable _table;
     LeafRows _leaves;

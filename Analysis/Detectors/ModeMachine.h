@@ -18,6 +18,7 @@ public:
     /// `name` must be a constant.
     explicit ModeMachineDetector(std::string_view name) : _name(name) {}
 
+    [[nodiscard]] bool wants(const CatalogueField& /*leaf*/) const override { return false; }
     void report(const MessageReport& report, const RadioPicture& picture, EventSink& sink) override;
     void interrupt(Time last, EventSink& sink) override;
 

@@ -25,6 +25,7 @@ public:
     /// A level that is older is not compared.
     static constexpr std::chrono::seconds oldest{2};
 
+    [[nodiscard]] bool wants(const CatalogueField& /*leaf*/) const override { return false; }
     void report(const MessageReport& report, const RadioPicture& picture, EventSink& sink) override;
     void interrupt(Time, EventSink&) override {
         _seen.clear();

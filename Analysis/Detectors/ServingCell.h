@@ -15,6 +15,7 @@ public:
     /// A return within this time is a ping-pong.
     static constexpr std::chrono::seconds pingPongTime{10};
 
+    [[nodiscard]] bool wants(const CatalogueField& /*leaf*/) const override { return false; }
     void report(const MessageReport& report, const RadioPicture& picture, EventSink& sink) override;
     void interrupt(Time, EventSink&) override {}
 };

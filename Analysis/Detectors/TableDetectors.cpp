@@ -15,16 +15,18 @@ void TableDetectors::add(std::unique_ptr<Detector> detector, std::vector<std::st
         _detectors.push_back({std::move(detector), std::move(paths)});
 }
 
+TableDetectors::Mask TableDetectors::maskOf(const CatalogueField& leaf) const {
+    Mask mask = 0;
+    for (std::size_t i = 0; i < _detectors.size(); ++i) {
+        const auto& paths = _detectors[i].paths;
+        if (std::find(paths.begin(), paths.end(), leaf.path) != paths.end())
+            mask |= Mask{1} << i;
+    }
+    return mask;
+}
+
 TableDetectors::Mask TableDetectors::concernedBy(const CatalogueField& leaf) {
-    return _concerned.at(leaf, [this](const CatalogueField& each) {
-        Mask mask = 0;
-        for (std::size_t i = 0; i < _detectors.size(); ++i) {
-            const auto& paths = _detectors[i].paths;
-            if (std::find(paths.begin(), paths.end(), each.path) != paths.end())
-                mask |= Mask{1} << i;
-        }
-        return mask;
-    });
+    return _concerned.at(leaf, [this](const CatalogueField& each) { return maskOf(each); });
 }
 
 void TableDetectors::report(const MessageReport& report, const RadioPicture& picture, EventSink& sink) {

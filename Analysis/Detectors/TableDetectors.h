@@ -25,6 +25,7 @@ public:
     /// passed to all.
     void add(std::unique_ptr<Detector> detector, std::vector<std::string_view> paths);
 
+    [[nodiscard]] bool wants(const CatalogueField& leaf) const override { return maskOf(leaf) != 0; }
     void report(const MessageReport& report, const RadioPicture& picture, EventSink& sink) override;
     void interrupt(Time last, EventSink& sink) override;
     void finish(Time last, EventSink& sink) override;
@@ -37,6 +38,7 @@ private:
         std::vector<std::string_view> paths;
     };
 
+    [[nodiscard]] Mask maskOf(const CatalogueField& leaf) const;
     [[nodiscard]] Mask concernedBy(const CatalogueField& leaf);
 
     std::vector<Each> _detectors;

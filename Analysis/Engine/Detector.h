@@ -16,6 +16,9 @@ class Detector {
 public:
     virtual ~Detector() = default;
 
+    /// Whether it uses what messages report of the leaf, beside the picture: what nothing uses is not in the
+    /// reports. The default is that it uses all.
+    [[nodiscard]] virtual bool wants(const CatalogueField& /*leaf*/) const { return true; }
     /// Called for every message, in order; `picture` includes it.
     virtual void report(const MessageReport& report, const RadioPicture& picture, EventSink& sink) = 0;
     /// What was known is not valid any more: messages are missing after `last`, or the clock jumped. What

@@ -5,6 +5,7 @@
 
 #include "Analysis/Detectors/BuiltIn.h"
 
+#include <algorithm>
 #include <utility>
 
 namespace velmora {
@@ -15,6 +16,11 @@ EventEngine::EventEngine(const Catalogue& catalogue, EventSink& sink)
 
 void EventEngine::add(std::unique_ptr<Detector> detector) {
     _detectors.push_back(std::move(detector));
+}
+
+bool EventEngine::wants(const CatalogueField& leaf) const {
+    return _picture.wants(leaf) || std::any_of(_detectors.begin(), _detectors.end(),
+                                               [&leaf](const auto& each) { return each->wants(leaf); });
 }
 
 void EventEngine::report(const MessageReport& report) {

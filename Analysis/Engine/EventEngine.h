@@ -28,6 +28,8 @@ public:
     /// Adds one that gets all further messages but malformed ones, after the earlier detectors.
     void add(std::unique_ptr<Detector> detector);
 
+    /// Whether it uses what messages report of the leaf. Reports need not have anything else.
+    [[nodiscard]] bool wants(const CatalogueField& leaf) const;
     /// The next message.
     void report(const MessageReport& report);
     /// The reader of the input found damage, such as a record of the file that is not whole, before the

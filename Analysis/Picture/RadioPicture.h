@@ -36,6 +36,8 @@ public:
     /// The catalogue, which may grow, must outlive it.
     explicit RadioPicture(const Catalogue& catalogue);
 
+    /// Whether it uses what messages report of the leaf.
+    [[nodiscard]] bool wants(const CatalogueField& leaf) const { return velmora::useOf(leaf, _table).isUsed; }
     void update(const MessageReport& report);
     /// Nothing is known any more.
     void clear();

@@ -21,6 +21,7 @@ public:
     /// The catalogue must outlive it.
     RuleDetector(std::span<const std::shared_ptr<const Rule>> rules, const Catalogue& catalogue);
 
+    [[nodiscard]] bool wants(const CatalogueField& leaf) const override { return _paths.reads(leaf); }
     void report(const MessageReport& report, const RadioPicture& picture, EventSink& sink) override;
     void interrupt(Time last, EventSink& sink) override;
 

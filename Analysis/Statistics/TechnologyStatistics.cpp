@@ -28,6 +28,10 @@ bool isNumbered(const std::optional<std::uint32_t>& cell) {
 TechnologyStatistics::TechnologyStatistics(const Catalogue& catalogue, StatisticsGroups& groups)
     : _catalogue(catalogue), _groups(groups), _picture(catalogue), _leaves(groups.plan().leaves) {}
 
+bool TechnologyStatistics::wants(const CatalogueField& leaf) const {
+    return _groups.plan().leaves.choose(leaf) || (has(StatisticsPlan::By::Cell) && _picture.wants(leaf));
+}
+
 void TechnologyStatistics::report(const MessageReport& report) {
     Time time = report.time;
     if (_now &&

@@ -29,6 +29,8 @@ public:
 
     /// Only these times count. Call it before the first message; the default is all times.
     void setCounted(const CountedTimes& counted) { _counted = counted; }
+    /// Whether it uses what messages report of the leaf.
+    [[nodiscard]] bool wants(const CatalogueField& leaf) const;
     void report(const MessageReport& report);
     /// Messages may be missing between the latest one and the next.
     void interrupt();

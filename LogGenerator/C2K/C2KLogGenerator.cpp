@@ -168,7 +168,8 @@ void C2KLogGenerator::decode(const Data& data, const std::optional<LogMessage>& 
             EffectsVisitor visitor(*effects);
             parser->decode(*reading, visitor);
         }
-        if (Observer* const observing = observer())
+        // No parser removes what records of another code show.
+        if (Observer* const observing = observer(); observing && _fieldMap.hasCode(message->logCode()))
             if (observing->beginSection(_fieldMap, message->logCode()))
                 parser->decode(*reading, *observing);
         _readings.use(lookup);
@@ -203,6 +204,11 @@ void C2KLogGenerator::describe(Catalogue& catalogue) {
         writer.setCode(parser->logCode());
         parser->describe(writer);
     }
+}
+
+void C2KLogGenerator::observe(Observer* observer) {
+    if (observer)
+        _fieldMap.setWanted(observer->wanted());
 }
 
 void C2KLogGenerator::processTemplate(const Dictionary& source, const DictionaryRef& display,

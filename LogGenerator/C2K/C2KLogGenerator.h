@@ -56,6 +56,7 @@ public:
 
 protected:
     void describe(Catalogue& catalogue) override;
+    void observe(Observer* observer) override;
 
 private:
     void update(Dictionary& state, const Data& data, MessageEffects* effects);

@@ -52,8 +52,8 @@ public:
     virtual void entryNumber(std::size_t index, std::uint16_t number) = 0;
     virtual void endList() = 0;
 
-    /// A list of one row for each complete entry, by a table.
-    void rows(const List& list, const CountedList& entries, const Layout& layout) {
+    /// A list of one row for each complete entry, by a table. The default names them one by one.
+    virtual void rows(const List& list, const CountedList& entries, const Layout& layout) {
         beginList(list);
         for (std::size_t i = 0, count = entries.completeCount(); i < count; ++i) {
             beginRow();

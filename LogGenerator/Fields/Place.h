@@ -23,7 +23,19 @@ struct Place {
     /// The first offset past the field.
     [[nodiscard]] constexpr std::size_t end() const { return offset + (bit + width + 7u) / 8u; }
     /// Preconditions: it is not computed, and the record reaches to `end()`.
-    [[nodiscard]] std::int64_t read(const Record& record) const;
+    [[nodiscard]] std::int64_t read(const Record& record) const {
+        if (isBigEndian)
+            return record.u16BigEndian(offset);
+        if (bit == 0) {
+            switch (width) {
+            case 8: return isSigned ? std::int64_t{record.i8(offset)} : record.u8(offset);
+            case 16: return isSigned ? std::int64_t{record.i16(offset)} : record.u16(offset);
+            case 32: return isSigned ? std::int64_t{record.i32(offset)} : record.u32(offset);
+            default: break;
+            }
+        }
+        return record.bits(offset, bit, width);
+    }
 };
 
 /// For a value that is not in the record as it is shown.

@@ -3,8 +3,11 @@
 
 #include "LogGenerator/Observations/FieldMap.h"
 
+#include "LogGenerator/Observations/WantedLeaves.h"
+
 #include <algorithm>
 #include <functional>
+#include <iterator>
 
 namespace velmora {
 
@@ -20,25 +23,62 @@ void FieldMap::sort() {
     // A field under several labels keeps the order in which these were added.
     std::stable_sort(_entries.begin(), _entries.end(),
                      [](const Entry& a, const Entry& b) { return isBefore(a, b.list, b.field); });
+    _wanted = _entries;
+    _tables.clear();
+    setCodes();
+}
+
+void FieldMap::setWanted(const WantedLeaves& wanted) {
+    const auto isWanted = [&wanted](const auto& each) { return wanted.hasAnyAt(*each.node); };
+    _wanted.clear();
+    std::copy_if(_entries.begin(), _entries.end(), std::back_inserter(_wanted), isWanted);
+    _wantedLists.clear();
+    std::copy_if(_lists.begin(), _lists.end(), std::back_inserter(_wantedLists), isWanted);
+    _tables.clear();
+    _expected = 0;
+    setCodes();
+}
+
+void FieldMap::setCodes() {
+    _codes.clear();
+    for (const Entry& each : _wanted)
+        _codes.push_back(each.source->code);
+    // A record that has no wanted field of a list replaces it all the same.
+    for (const Entry& each : _entries)
+        if (std::any_of(_wantedLists.begin(), _wantedLists.end(),
+                        [&each](const ListEntry& list) { return list.list == each.list; }))
+            _codes.push_back(each.source->code);
+    std::sort(_codes.begin(), _codes.end());
+    _codes.erase(std::unique(_codes.begin(), _codes.end()), _codes.end());
 }
 
 std::span<const FieldMap::Entry> FieldMap::find(const List* list, const Field& field) const {
     std::size_t first = _expected;
-    if (first >= _entries.size() || _entries[first].list != list || _entries[first].field != &field) {
+    if (first >= _wanted.size() || _wanted[first].list != list || _wanted[first].field != &field) {
         const auto found = std::lower_bound(
-            _entries.begin(), _entries.end(), &field,
+            _wanted.begin(), _wanted.end(), &field,
             [list](const Entry& entry, const Field* wanted) { return isBefore(entry, list, wanted); });
-        first = static_cast<std::size_t>(found - _entries.begin());
+        first = static_cast<std::size_t>(found - _wanted.begin());
     }
     std::size_t end = first;
-    while (end < _entries.size() && _entries[end].list == list && _entries[end].field == &field)
+    while (end < _wanted.size() && _wanted[end].list == list && _wanted[end].field == &field)
         ++end;
     _expected = end;
-    return {_entries.data() + first, end - first};
+    return {_wanted.data() + first, end - first};
+}
+
+std::span<const FieldMap::Entry> FieldMap::addTable(const List* list, const Layout& layout,
+                                                    std::uint32_t code) const {
+    Table& table = _tables.emplace_back(Table{list, layout.fields, code, {}});
+    for (const Field& field : layout.fields)
+        for (const Entry& entry : find(list, field))
+            if (entry.source->code == code)
+                table.entries.push_back(entry);
+    return table.entries;
 }
 
 const CatalogueField* FieldMap::leafOf(std::string_view label) const {
-    for (const Entry& entry : _entries)
+    for (const Entry& entry : _wanted)
         if (!entry.list && entry.field->label == label)
             return entry.node->leaf();
     return nullptr;
@@ -48,8 +88,8 @@ std::span<const FieldMap::ListEntry> FieldMap::findList(const List* outer, const
     const auto matches = [outer, &list](const ListEntry& entry) {
         return entry.outer == outer && entry.list == &list;
     };
-    const auto first = std::find_if(_lists.begin(), _lists.end(), matches);
-    const auto end = std::find_if_not(first, _lists.end(), matches);
+    const auto first = std::find_if(_wantedLists.begin(), _wantedLists.end(), matches);
+    const auto end = std::find_if_not(first, _wantedLists.end(), matches);
     return {first, end};
 }
 

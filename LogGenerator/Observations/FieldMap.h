@@ -6,13 +6,17 @@
 #include "LogGenerator/Observations/Catalogue.h"
 #include "Platform/Clock.h"
 
+#include <algorithm>
 #include <cstddef>
+#include <cstdint>
 #include <optional>
 #include <span>
 #include <string>
 #include <vector>
 
 namespace velmora {
+
+class WantedLeaves;
 
 /// Where a section's fields and lists are in the catalogue.
 class FieldMap {
@@ -42,28 +46,62 @@ public:
     [[nodiscard]] const std::string& section() const { return _section; }
 
     void add(const Entry& entry) { _entries.push_back(entry); }
-    void add(const ListEntry& entry) { _lists.push_back(entry); }
+    void add(const ListEntry& entry) {
+        _lists.push_back(entry);
+        _wantedLists.push_back(entry);
+    }
     /// When the section's latest record arrived, since its records are observed; absent where none has.
     [[nodiscard]] const std::optional<Time>& latestRecord() const { return _latestRecord; }
     void setLatestRecord(Time arrival) const { _latestRecord = arrival; }
 
     /// Call it when all have been added, before anything is looked up.
     void sort();
+    /// From now on only what shows a wanted leaf is found. By default all is.
+    void setWanted(const WantedLeaves& wanted);
 
-    /// All that have been added.
-    [[nodiscard]] std::span<const Entry> entries() const { return _entries; }
+    /// All that show a wanted leaf.
+    [[nodiscard]] std::span<const Entry> entries() const { return _wanted; }
+    [[nodiscard]] bool isEmpty() const { return _wanted.empty() && _wantedLists.empty(); }
+    /// Whether records of that code may report a wanted leaf or a list of them.
+    [[nodiscard]] bool hasCode(std::uint32_t code) const {
+        return std::binary_search(_codes.begin(), _codes.end(), code);
+    }
     /// The leaves that show the field; most have one. Fields are looked up fastest in the order of their
     /// tables.
     [[nodiscard]] std::span<const Entry> find(const List* list, const Field& field) const;
+    /// The same for all fields of a table, in its order, as far as records of that code show them. They are
+    /// looked up once.
+    [[nodiscard]] std::span<const Entry> findAll(const List* list, const Layout& layout,
+                                                 std::uint32_t code) const {
+        for (const Table& table : _tables)
+            if (table.fields.data() == layout.fields.data() && table.list == list && table.code == code &&
+                table.fields.size() == layout.fields.size())
+                return table.entries;
+        return addTable(list, layout, code);
+    }
     /// The leaf of that label in the section's own dictionary; null for none.
     [[nodiscard]] const CatalogueField* leafOf(std::string_view label) const;
     [[nodiscard]] std::span<const ListEntry> findList(const List* outer, const List& list) const;
 
 private:
+    /// What `findAll` has found.
+    struct Table {
+        const List* list;
+        std::span<const Field> fields;
+        std::uint32_t code;
+        std::vector<Entry> entries;
+    };
+    void setCodes();
+    std::span<const Entry> addTable(const List* list, const Layout& layout, std::uint32_t code) const;
+
     Catalogue* _catalogue = nullptr;
     std::string _section;
     std::vector<Entry> _entries; ///< by list and field
     std::vector<ListEntry> _lists;
+    std::vector<Entry> _wanted; ///< of the entries, in their order
+    std::vector<ListEntry> _wantedLists;
+    std::vector<std::uint32_t> _codes; ///< of what is wanted, in order
+    mutable std::vector<Table> _tables;
     mutable std::optional<Time> _latestRecord; ///< no part of what the map says of the section
     mutable std::size_t _expected = 0;         ///< the entry that follows the one found last
 };

@@ -81,6 +81,12 @@ class ObservationSink {
 public:
     virtual ~ObservationSink() = default;
     virtual void observed(const ObservedMessage& message) = 0;
+
+    /// Whether it uses what is observed of the leaf: others need not be observed. It is asked when it is set
+    /// as the sink, or when messages name the leaf later. By default it uses all.
+    [[nodiscard]] virtual bool wants(const CatalogueField& /*leaf*/) const { return true; }
+    /// Whether it uses `Observation::rowKey`, which is empty otherwise. By default it does.
+    [[nodiscard]] virtual bool wantsRowKeys() const { return true; }
 };
 
 } // namespace velmora

@@ -22,8 +22,8 @@ void Observer::beginMessage() {
     _removed.clear();
     _levels.clear();
     _texts.clear();
-    _usedRows = 0;
-    _row = nullptr;
+    _usedRowNumbers = _usedDeepRows = 0;
+    _row = {};
 }
 
 bool Observer::beginSection(const FieldMap& map, std::uint32_t code) {
@@ -33,7 +33,7 @@ bool Observer::beginSection(const FieldMap& map, std::uint32_t code) {
     _sections.push_back(section);
     _map = &map;
     _code = code;
-    return true;
+    return !map.isEmpty();
 }
 
 ObservedMessage Observer::message(Time arrival, std::optional<std::uint32_t> code,
@@ -47,8 +47,7 @@ Observation& Observer::add(const CatalogueField& leaf, const CatalogueSource* so
     Observation& observation = _observations.emplace_back();
     observation.leaf = &leaf;
     observation.source = source;
-    if (_row)
-        observation.rows = *_row;
+    observation.rows = _row;
     if (!_levels.empty())
         observation.rowKey = _levels.back().numberKey;
     return observation;
@@ -58,28 +57,55 @@ template <class Observe>
 void Observer::forEachLeaf(const Field& field, Observe observe) {
     beginValue();
     for (const FieldMap::Entry& entry : _map->find(currentList(), field))
-        if (entry.source->code == _code)
+        if (entry.source->code == _code && _wanted.has(*entry.node->leaf()))
             observe(entry, add(*entry.node->leaf(), entry.source));
 }
 
 void Observer::fields(const Record& record, const Layout& layout) {
-    for (const Field& field : layout.fields)
-        number(field, field.place.read(record));
+    const List* const list = currentList();
+    if (list && list->entries == List::Entries::Values) {
+        for (const Field& field : layout.fields)
+            number(field, field.place.read(record));
+        return;
+    }
+    tableFields(_map->findAll(list, layout, _code), record);
+}
+
+void Observer::tableFields(std::span<const FieldMap::Entry> entries, const Record& record) {
+    for (const FieldMap::Entry& entry : entries)
+        setNumber(entry, entry.field->place.read(record), add(*entry.node->leaf(), entry.source));
+}
+
+void Observer::rows(const List& list, const CountedList& entries, const Layout& layout) {
+    beginList(list);
+    const std::span<const FieldMap::Entry> found = _map->findAll(&list, layout, _code);
+    const std::size_t count = entries.completeCount();
+    for (std::size_t i = 0; i < count && !found.empty(); ++i) {
+        beginRow();
+        tableFields(found, entries[i]);
+        endRow();
+    }
+    _levels.back().next = static_cast<std::uint32_t>(count);
+    endList();
 }
 
 void Observer::number(const Field& field, std::int64_t raw) {
     forEachLeaf(field, [&](const FieldMap::Entry& entry, Observation& observation) {
-        observation.text = Observation::Text::OfRaw;
-        observation.raw = raw;
-        if (field.format.hasSpecial && raw == field.format.specialValue)
-            return; // absent
-        observation.kind = entry.kind;
-        if (entry.kind == ObservedKind::Number) {
-            observation.number = shownNumber(field, raw) * entry.scale + entry.offset;
-        } else if (entry.kind == ObservedKind::Text) {
-            setCode(field, codeText(field, raw, _texts), observation);
-        }
+        setNumber(entry, raw, observation);
     });
+}
+
+void Observer::setNumber(const FieldMap::Entry& entry, std::int64_t raw, Observation& observation) {
+    const Field& field = *entry.field;
+    observation.text = Observation::Text::OfRaw;
+    observation.raw = raw;
+    if (field.format.hasSpecial && raw == field.format.specialValue)
+        return; // absent
+    observation.kind = entry.kind;
+    if (entry.kind == ObservedKind::Number)
+        observation.number = shownNumber(field, raw) * entry.scale + entry.offset;
+    else if (entry.kind == ObservedKind::Text)
+        setCode(field, codeText(field, raw, _texts), observation);
 }
 
 void Observer::real(const Field& field, double value) {
@@ -129,7 +155,7 @@ void Observer::removeOthers(const Catalogue::Node& node, std::size_t first) {
     const auto shown = _observations.begin() + static_cast<std::ptrdiff_t>(first);
     const CatalogueField* const leaf = node.leaf();
     const auto isLeaf = [leaf](const Observation& each) { return each.leaf == leaf; };
-    if (leaf && std::none_of(shown, _observations.end(), isLeaf))
+    if (leaf && _wanted.has(*leaf) && std::none_of(shown, _observations.end(), isLeaf))
         _removed.push_back(leaf);
     for (const std::unique_ptr<Catalogue::Node>& child : node.children())
         removeOthers(*child, first);
@@ -147,6 +173,8 @@ void Observer::display(Catalogue& catalogue, const Value& value) {
 }
 
 void Observer::leaf(const CatalogueField& leaf, const Value& value) {
+    if (!_wanted.has(leaf))
+        return;
     setSupplied(value, _texts, add(leaf, leaf.sources.empty() ? nullptr : &leaf.sources.front()));
 }
 
@@ -158,7 +186,7 @@ void Observer::tree(Catalogue& catalogue, Catalogue::Node& node, std::string_vie
                 tree(catalogue, *place, section, child);
     } else if (const Array* const array = value.asArray()) {
         _lists.push_back({&node, static_cast<std::uint32_t>(array->size())});
-        const RowNumbers* const outer = _row;
+        const RowNumbers outer = _row;
         for (std::size_t i = 0; i < array->size(); ++i) {
             _row = outer;
             newRow(static_cast<std::uint32_t>(i));
@@ -198,6 +226,8 @@ void Observer::endWhole() {
         if (entry.list)
             continue; // goes with the list
         const CatalogueField& leaf = *entry.node->leaf();
+        if (!_wanted.has(leaf))
+            continue;
         if (!_named[leaf.index] && mayBeShown(leaf))
             _removed.push_back(&leaf);
         setShown(leaf, _named[leaf.index]);
@@ -211,14 +241,20 @@ void Observer::setShown(const CatalogueField& leaf, bool isShown) {
 }
 
 void Observer::newRow(std::uint32_t number) {
-    if (_usedRows == _rows.size())
-        _rows.emplace_back();
-    RowNumbers& row = _rows[_usedRows++];
-    row.clear();
-    if (_row)
-        row.assign(_row->begin(), _row->end());
+    if (_row.empty()) {
+        if (_usedRowNumbers == _rowNumbers.size())
+            _rowNumbers.emplace_back();
+        std::uint32_t& only = _rowNumbers[_usedRowNumbers++];
+        only = number;
+        _row = {&only, 1};
+        return;
+    }
+    if (_usedDeepRows == _deepRows.size())
+        _deepRows.emplace_back();
+    std::vector<std::uint32_t>& row = _deepRows[_usedDeepRows++];
+    row.assign(_row.begin(), _row.end());
     row.push_back(number);
-    _row = &row;
+    _row = row;
 }
 
 void Observer::beginList(const List& list) {
@@ -247,7 +283,7 @@ void Observer::endRow() {
 }
 
 void Observer::setKey(std::size_t first, std::span<const std::string_view> names) {
-    if (names.empty() || first == _observations.size())
+    if (names.empty() || first == _observations.size() || !_wanted.hasRowKeys())
         return;
     const std::span<Observation> row(&_observations[first], _observations.size() - first);
     const std::size_t depth = row.front().rows.size();
@@ -268,7 +304,8 @@ void Observer::entryNumber(std::size_t, std::uint16_t number) {
     _row = level.outerRow;
     newRow(number);
     ++level.next;
-    level.numberKey = _texts.add() = std::to_string(number);
+    if (_wanted.hasRowKeys())
+        level.numberKey = _texts.add() = std::to_string(number);
 }
 
 void Observer::endList() {
@@ -277,7 +314,7 @@ void Observer::endList() {
     _row = level.outerRow;
     for (const FieldMap::ListEntry& entry : _map->findList(currentList(), *level.list)) {
         _lists.push_back({entry.node, level.next});
-        if (level.next == 0 && !level.list->whenEmpty.empty())
+        if (level.next == 0 && !level.list->whenEmpty.empty() && _wanted.has(*entry.node->leaf()))
             add(*entry.node->leaf(), nullptr).given = level.list->whenEmpty;
     }
 }

@@ -7,11 +7,13 @@
 #include "LogGenerator/Observations/FieldMap.h"
 #include "LogGenerator/Observations/Observation.h"
 #include "LogGenerator/Observations/TextArena.h"
+#include "LogGenerator/Observations/WantedLeaves.h"
 
 #include <cstddef>
 #include <cstdint>
 #include <deque>
 #include <optional>
+#include <span>
 #include <string_view>
 #include <utility>
 #include <vector>
@@ -24,10 +26,15 @@ class Dictionary;
 /// nothing. What a map does not have, since the display has no place for it, is not observed.
 class Observer final : public FieldVisitor {
 public:
+    /// Only what is wanted is observed from now on. By default all is.
+    void setWanted(WantedLeaves wanted) { _wanted = std::move(wanted); }
+    [[nodiscard]] const WantedLeaves& wanted() const { return _wanted; }
+
     /// A message begins; what was observed of the earlier one is gone.
     void beginMessage();
     /// The fields of a section follow, from a record of that code. False where the section has named that
-    /// record's fields already: a code that is subscribed twice is observed once.
+    /// record's fields already: a code that is subscribed twice is observed once. Also where nothing of the
+    /// section is wanted.
     [[nodiscard]] bool beginSection(const FieldMap& map, std::uint32_t code);
     /// The decoder found the message malformed. The first damage of a message counts.
     void damaged(Damage damage) {
@@ -45,6 +52,7 @@ public:
     void display(Catalogue& catalogue, const Value& value);
 
     void fields(const Record& record, const Layout& layout) override;
+    void rows(const List& list, const CountedList& entries, const Layout& layout) override;
     void number(const Field& field, std::int64_t raw) override;
     void real(const Field& field, double value) override;
     void text(const Field& field, std::string_view text) override;
@@ -62,10 +70,10 @@ public:
     void endList() override;
 
 private:
-    using RowNumbers = std::vector<std::uint32_t>;
+    using RowNumbers = std::span<const std::uint32_t>;
     struct Level {
         const List* list;
-        const RowNumbers* outerRow;      ///< that the list is in; null for none
+        RowNumbers outerRow;             ///< that the list is in; empty for none
         std::uint32_t next = 0;          ///< the index of the next entry
         std::size_t firstOfRow = 0;      ///< the first observation of the row
         std::string_view numberKey = {}; ///< of the entry in a numbered list
@@ -75,6 +83,9 @@ private:
     /// Calls `observe(entry, observation)` for each leaf that shows the field.
     template <class Observe>
     void forEachLeaf(const Field& field, Observe observe);
+    /// The fields of a table by what the map has found of them.
+    void tableFields(std::span<const FieldMap::Entry> entries, const Record& record);
+    void setNumber(const FieldMap::Entry& entry, std::int64_t raw, Observation& observation);
     Observation& add(const CatalogueField& leaf, const CatalogueSource* source);
     /// Sets what identifies the row of the observations from `first` on, by the leaves of these names.
     void setKey(std::size_t first, std::span<const std::string_view> names);
@@ -107,9 +118,12 @@ private:
     std::vector<Level> _levels;
     TextArena _texts;
     ObservedText _keyText;
-    std::deque<RowNumbers> _rows; ///< the numbers of each row, a storage that is used again
-    std::size_t _usedRows = 0;
-    const RowNumbers* _row = nullptr; ///< the current one; null outside of lists
+    RowNumbers _row;                       ///< the numbers of the current row; empty outside of lists
+    std::deque<std::uint32_t> _rowNumbers; ///< of rows in one list, which stay where they are
+    std::size_t _usedRowNumbers = 0;
+    std::deque<std::vector<std::uint32_t>> _deepRows; ///< of rows in lists of rows; the storage is used again
+    std::size_t _usedDeepRows = 0;
+    WantedLeaves _wanted;
 };
 
 } // namespace velmora

@@ -34,6 +34,10 @@ public:
     virtual ~MessageAnalysis() = default;
 
     virtual void report(const MessageReport& report) = 0;
+    /// Whether it uses what messages report of the leaf, and the row keys of lists: what it does not use is
+    /// not observed. It uses all by default.
+    [[nodiscard]] virtual bool wants(const CatalogueField& /*leaf*/) const { return true; }
+    [[nodiscard]] virtual bool wantsRowKeys() const { return true; }
     virtual void reportUndecoded(const UndecodedReport& /*report*/) {}
     /// Messages may be missing between the latest one and the next. Passed to the analysis of every
     /// technology, since a lost record's is unknown.

@@ -42,6 +42,8 @@ public:
 private:
     TechnologyFeed(std::string technology, AnalysisClock clock, std::optional<Time>& first);
     void observed(const ObservedMessage& message) override;
+    [[nodiscard]] bool wants(const CatalogueField& leaf) const override { return _analysis->wants(leaf); }
+    [[nodiscard]] bool wantsRowKeys() const override { return _analysis->wantsRowKeys(); }
     [[nodiscard]] Time timeOf(std::optional<Time> modem);
 
     std::string _technology;

@@ -17,6 +17,8 @@ public:
     void add(std::unique_ptr<Detector> detector) { _engine.add(std::move(detector)); }
 
     void report(const MessageReport& report) override { _engine.report(report); }
+    [[nodiscard]] bool wants(const CatalogueField& leaf) const override { return _engine.wants(leaf); }
+    [[nodiscard]] bool wantsRowKeys() const override { return false; }
     void reportUndecoded(const UndecodedReport& report) override;
     void reportLoss(const InputLoss& loss) override { _engine.damaged(loss.at, loss.reason); }
     void interrupt() override { _engine.interrupt(); }

@@ -18,6 +18,8 @@ public:
         : _statistics(catalogue, groups), _range(range), _feed(feed) {}
 
     void report(const MessageReport& report) override;
+    [[nodiscard]] bool wants(const CatalogueField& leaf) const override { return _statistics.wants(leaf); }
+    [[nodiscard]] bool wantsRowKeys() const override { return false; }
     void reportLoss(const InputLoss&) override { _statistics.interrupt(); }
     void finish() override { _statistics.finish(); }
 

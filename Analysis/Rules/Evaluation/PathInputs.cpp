@@ -36,6 +36,11 @@ PathInputs::PathInputs(const Catalogue& catalogue, const InputStore& inputs) : _
             _paths.push_back({i, input.path, input.isEach()});
 }
 
+bool PathInputs::reads(const CatalogueField& leaf) const {
+    return std::any_of(_paths.begin(), _paths.end(),
+                       [&leaf](const Path& each) { return leafAt(leaf, each.path).has_value(); });
+}
+
 std::span<const PathInputs::Use> PathInputs::usesOf(const CatalogueField& leaf) {
     // Messages may have named further leaves.
     while (_uses.size() <= leaf.index) {

@@ -23,6 +23,8 @@ public:
     /// The catalogue, which may grow, must outlive it. Precondition: rules have added their inputs.
     PathInputs(const Catalogue& catalogue, const InputStore& inputs);
 
+    /// Whether an input reads the leaf.
+    [[nodiscard]] bool reads(const CatalogueField& leaf) const;
     void update(const ObservedMessage& message, InputStore& inputs);
 
     /// Sets the value of the leaf in these rows.
