@@ -43,6 +43,13 @@ MessageMask* PrivacySwitch::mask() {
     return _mask.get();
 }
 
+std::optional<MaskSeal> PrivacySwitch::seal() const {
+    if (!_isOn || !_mask)
+        return std::nullopt;
+    const MaskOptions& options = _mask->options();
+    return MaskSeal{options.level, options.key.fingerprint(), {}};
+}
+
 std::optional<Data> PrivacySwitch::shown(const Data& message, std::string_view technology, Time now) {
     if (!_isOn)
         return message;

@@ -4,6 +4,7 @@
 #pragma once
 
 #include "Export/Masking/MaskKey.h"
+#include "Export/Masking/MaskSeal.h"
 #include "Platform/Bytes.h"
 #include "Platform/Clock.h"
 #include "Platform/Preferences.h"
@@ -30,6 +31,9 @@ public:
     [[nodiscard]] bool isOn() const { return _isOn; }
     /// The preferences remember it.
     void setOn(bool isOn);
+
+    /// What a file of masked messages says of itself. Absent where they are not masked, or nothing has been.
+    [[nodiscard]] std::optional<MaskSeal> seal() const;
 
     /// The message as it may be shown, of that technology, which arrives now. Absent where nothing of it may
     /// be shown.

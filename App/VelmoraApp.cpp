@@ -111,6 +111,10 @@ void VelmoraApp::closeSaveView() {
         startAnew();
 }
 
+std::optional<MaskSeal> VelmoraApp::maskSeal() const {
+    return _privacy ? _privacy->seal() : std::nullopt;
+}
+
 void VelmoraApp::startAnew() {
     const ArrayRef contents = _model->getSaveContents();
     if (allowSaveButton() && contents && !contents->empty() && !std::exchange(_offeredSave, true)) {

@@ -80,6 +80,8 @@ public:
     void showSaveView();
     /// Closes the save screen; does nothing when it is not open.
     void closeSaveView();
+    /// What a snapshot says of itself; absent where messages are not masked.
+    [[nodiscard]] std::optional<MaskSeal> maskSeal() const;
 
     void updateStatusForViewController(VelmoraPaneController& pane);
     void updateViewControllerFromModel() override;

@@ -5,6 +5,7 @@
 
 #include "App/VelmoraApp.h"
 #include "App/VelmoraSaveView.h"
+#include "Export/Masking/SealedFile.h"
 #include "Model/Snapshot.h"
 #include "Platform/SystemLog.h"
 #include "PropertyLists/PropertyList.h"
@@ -27,12 +28,15 @@ constexpr double cellFontSize = 13;
 
 VelmoraSaveViewController::VelmoraSaveViewController(const ArrayRef& saveHistory, VelmoraApp& app)
     : _timeStamp(app.platform().model().clock.now()),
-      _saveHistory(saveHistory ? Value(saveHistory).copy().arrayRef() : nullptr), _app(app) {}
+      _saveHistory(saveHistory ? Value(saveHistory).copy().arrayRef() : nullptr), _seal(app.maskSeal()),
+      _app(app) {}
 
 VelmoraSaveViewController::~VelmoraSaveViewController() = default;
 
 std::unique_ptr<View> VelmoraSaveViewController::loadView() {
     auto view = std::make_unique<VelmoraSaveView>(_saveContentTable, _saveDescription);
+    if (_seal)
+        _saveDescription.setPlaceholder("Description (left out while identities are masked)");
     view->saveButton().setAction([this] { savePressed(); });
     view->cancelButton().setAction([this] { cancelPressed(); });
     view->setOnTap([this] { backgroundTouched(); });
@@ -70,7 +74,11 @@ std::string VelmoraSaveViewController::snapshotPath() const {
 
 bool VelmoraSaveViewController::writeSnapshot(const std::string& path) const {
     try {
-        const auto list = writePropertyList(makeSnapshot(_timeStamp, _saveHistory, _saveDescription.text()));
+        const Value snapshot(makeSnapshot(_timeStamp, _saveHistory, _saveDescription.text()));
+        // What is typed may name a person, and the seal has its place.
+        const Result<Done> sealed =
+            _seal && _saveHistory ? sealSnapshot(snapshot, *_seal) : Result<Done>(Done{});
+        const auto list = sealed ? writePropertyList(snapshot) : Failure{sealed.reason()};
         const auto written =
             list ? _app.platform().files().writeDirectly(path, *list) : Failure{list.reason()};
         if (!written)

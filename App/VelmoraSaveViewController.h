@@ -3,6 +3,7 @@
 
 #pragma once
 
+#include "Export/Masking/MaskSeal.h"
 #include "Platform/Clock.h"
 #include "PropertyLists/Value.h"
 #include "Toolkit/Navigation/ViewController.h"
@@ -13,6 +14,7 @@
 #include "Toolkit/TextFieldDelegate.h"
 
 #include <memory>
+#include <optional>
 #include <string>
 
 namespace velmora {
@@ -58,13 +60,14 @@ protected:
 
 private:
     [[nodiscard]] std::string snapshotPath() const;
-    /// With what the field says now.
+    /// With what the field says now, or the seal.
     [[nodiscard]] bool writeSnapshot(const std::string& path) const;
     void queueClosing();
 
     /// When the screen was created, which is the snapshot's time, not that of saving.
     Time _timeStamp;
     ArrayRef _saveHistory;
+    std::optional<MaskSeal> _seal; ///< of a snapshot of masked messages
     TableView _saveContentTable;
     TextField _saveDescription;
     VelmoraApp& _app;

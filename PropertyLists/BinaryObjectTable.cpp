@@ -67,13 +67,6 @@ Result<BinaryObjectTable> BinaryObjectTable::open(Bytes input) {
     return result;
 }
 
-std::uint64_t BinaryObjectTable::numberAt(std::size_t offset, std::size_t size) const {
-    std::uint64_t number = 0;
-    for (const std::uint8_t byte : _input.subspan(offset, size))
-        number = number << 8 | byte;
-    return number;
-}
-
 Result<BinaryObject> BinaryObjectTable::object(std::uint64_t index) const {
     // The index is below the object count, whose offsets all lie inside the input: nothing overflows here.
     const std::size_t entry = _table + static_cast<std::size_t>(index) * _offsetSize;

@@ -36,7 +36,12 @@ public:
     [[nodiscard]] std::size_t end() const { return _table; }
 
     /// A big-endian number of 1 to 8 bytes. Precondition: the bytes lie inside the input.
-    [[nodiscard]] std::uint64_t numberAt(std::size_t offset, std::size_t size) const;
+    [[nodiscard]] std::uint64_t numberAt(std::size_t offset, std::size_t size) const {
+        std::uint64_t number = 0;
+        for (const std::uint8_t byte : _input.subspan(offset, size))
+            number = number << 8 | byte;
+        return number;
+    }
     /// Precondition: the bytes lie inside the input.
     [[nodiscard]] Bytes bytesAt(std::size_t offset, std::size_t size) const {
         return _input.subspan(offset, size);

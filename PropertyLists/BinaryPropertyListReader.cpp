@@ -55,6 +55,8 @@ private:
     bool readCount(BinaryObject& object);
     bool readData(const BinaryObject& object, Value& value);
     bool readASCII(const BinaryObject& object, Value& value);
+    bool findASCII(const BinaryObject& object, std::string_view& text);
+    bool readKey(std::size_t reference, std::size_t depth, Value& value, std::string_view& key);
     bool readUTF16(const BinaryObject& object, Value& value);
     bool readArray(const BinaryObject& object, std::size_t depth, Value& value);
     bool readDictionary(const BinaryObject& object, std::size_t depth, Value& value);
@@ -110,7 +112,8 @@ bool Reader::readData(const BinaryObject& object, Value& value) {
     return true;
 }
 
-bool Reader::readASCII(const BinaryObject& object, Value& value) {
+/// Checks a text of ASCII, which is its bytes in the input.
+bool Reader::findASCII(const BinaryObject& object, std::string_view& text) {
     if (object.count > bytesLeft(object))
         return failAt(object.offset, "a string has " + std::to_string(object.count) + " bytes, " +
                                          std::to_string(bytesLeft(object)) + " are left");
@@ -123,7 +126,33 @@ bool Reader::readASCII(const BinaryObject& object, Value& value) {
     if (notASCII != bytes.end())
         return failAt(object.content + static_cast<std::size_t>(notASCII - bytes.begin()),
                       "an ASCII string holds " + hexByte(*notASCII));
-    value = Value(std::string(bytes.begin(), bytes.end()));
+    text = {reinterpret_cast<const char*>(bytes.data()), bytes.size()};
+    return true;
+}
+
+bool Reader::readASCII(const BinaryObject& object, Value& value) {
+    std::string_view text;
+    if (!findASCII(object, text))
+        return false;
+    value = Value(std::string(text));
+    return true;
+}
+
+/// The key to which there is a reference at that offset: of the input where it is ASCII, since a copy beside
+/// the dictionary's would be most of the cost, else of the value.
+bool Reader::readKey(std::size_t reference, std::size_t depth, Value& value, std::string_view& key) {
+    const std::uint64_t index = _table.numberAt(reference, _table.referenceSize());
+    if (const auto found = _table.object(index); found && found->marker >> 4 == 0x5) {
+        BinaryObject object = *found;
+        return isAllowed(_budget.takeObject()) && readCount(object) && findASCII(object, key);
+    }
+    if (!readObject(index, depth, value))
+        return false;
+    const std::string* const text = value.asString();
+    if (!text)
+        return failAt(reference, "a dictionary's key is of the kind " + std::string(nameOf(value.kind())) +
+                                     ", not string");
+    key = *text;
     return true;
 }
 
@@ -207,19 +236,16 @@ bool Reader::readDictionary(const BinaryObject& object, std::size_t depth, Value
         // All keys come first, then all values.
         const std::size_t keyReference = object.content + i * _table.referenceSize();
         const std::size_t valueReference = keyReference + count * _table.referenceSize();
-        Value key;
-        if (!readObject(_table.numberAt(keyReference, _table.referenceSize()), depth + 1, key))
+        Value keyValue;
+        std::string_view key;
+        if (!readKey(keyReference, depth + 1, keyValue, key))
             return false;
-        const std::string* keyText = key.asString();
-        if (!keyText)
-            return failAt(keyReference, "a dictionary's key is of the kind " +
-                                            std::string(nameOf(key.kind())) + ", not string");
-        if (!isAllowed(_budget.takeBytes(keyText->size())))
+        if (!isAllowed(_budget.takeBytes(key.size())))
             return false;
         Value element;
         if (!readObject(_table.numberAt(valueReference, _table.referenceSize()), depth + 1, element))
             return false;
-        dictionary->set(*keyText, std::move(element));
+        dictionary->set(key, std::move(element));
     }
     _open.pop_back();
     value = std::move(dictionary);

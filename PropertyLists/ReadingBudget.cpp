@@ -20,19 +20,9 @@ Failure ReadingBudget::tooManyObjects() const {
                                       " objects, repeated ones counted");
 }
 
-std::optional<Failure> ReadingBudget::takeObject() {
-    if (_objects == 0)
-        return tooManyObjects();
-    --_objects;
-    return takeBytes(bytesAnObject);
-}
-
-std::optional<Failure> ReadingBudget::takeBytes(std::size_t size) {
-    if (size > _bytes)
-        return limitExceeded(_limits, "the list takes more than " + std::to_string(_limits.maximumMemory) +
-                                          " bytes of memory, repeated text and data counted");
-    _bytes -= size;
-    return std::nullopt;
+Failure ReadingBudget::tooManyBytes() const {
+    return limitExceeded(_limits, "the list takes more than " + std::to_string(_limits.maximumMemory) +
+                                      " bytes of memory, repeated text and data counted");
 }
 
 } // namespace velmora

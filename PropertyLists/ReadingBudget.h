@@ -27,11 +27,22 @@ public:
 
     /// Each of these fails where a limit is exceeded, with the reason, which the log gets too where the
     /// limits say so.
-    [[nodiscard]] std::optional<Failure> takeObject();
+    [[nodiscard]] std::optional<Failure> takeObject() {
+        if (_objects == 0)
+            return tooManyObjects();
+        --_objects;
+        return takeBytes(bytesAnObject);
+    }
     /// For a text or data; for a key twice, since a dictionary keeps it in the entry and in the index.
-    [[nodiscard]] std::optional<Failure> takeBytes(std::size_t size);
+    [[nodiscard]] std::optional<Failure> takeBytes(std::size_t size) {
+        if (size > _bytes)
+            return tooManyBytes();
+        _bytes -= size;
+        return std::nullopt;
+    }
 
     [[nodiscard]] Failure tooManyObjects() const;
+    [[nodiscard]] Failure tooManyBytes() const;
 
 private:
     const PropertyListLimits& _limits;

@@ -43,6 +43,8 @@ struct Rule {
 
     /// How long a condition may be unknown until the rule starts from the beginning.
     static constexpr std::chrono::seconds longestUnknown{10};
+    /// How long a level or quality counts as measured after its last report, where a condition has to hold.
+    static constexpr std::chrono::seconds longestUnmeasured{2};
 };
 
 /// Whether messages of the technology can make the rule's events: it reads something that the catalogue has,

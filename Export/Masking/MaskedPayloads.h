@@ -20,7 +20,8 @@
 namespace velmora {
 
 /// Property lists that have been masked lately. What is always the same - SIM, modem, contexts - is sent
-/// again and again, and to read and write a list takes far longer than to look it up. Memory is bounded.
+/// again and again, and to read and write a list takes far longer than to look it up. Most others come once,
+/// as cells with their levels do: a list is kept when it comes for the second time. Memory is bounded.
 class MaskedPayloads {
 public:
     struct Entry {
@@ -36,6 +37,9 @@ public:
     }
     void add(PropertyListKind kind, Bytes payload, Entry entry) {
         if (payload.size() > longest)
+            return;
+        const std::size_t hash = Hash{}(textOf(payload));
+        if (std::exchange(_seen[hash % _seen.size()], hash) != hash)
             return;
         _size += payload.size() + entry.masked.size();
         if (_size > mostBytes) {
@@ -62,6 +66,7 @@ private:
     }
 
     std::array<std::unordered_map<std::string, Entry, Hash, std::equal_to<>>, kinds> _lists;
+    std::array<std::size_t, 1024> _seen{}; ///< hashes of lists that have come at least once
     std::size_t _size = 0;
 };
 

@@ -7,6 +7,7 @@
 #include "Platform/TelephonyService.h"
 
 #include <algorithm>
+#include <functional>
 #include <unordered_map>
 
 namespace velmora {
@@ -231,7 +232,16 @@ constexpr PropertyKey modemKeys[] = {
     {kVoxPositionTime, ClockTime},
 };
 
-using Forms = std::unordered_map<std::string_view, PropertyForm>;
+/// The keys of a table differ in their ends.
+struct EndHash {
+    std::size_t operator()(std::string_view key) const {
+        constexpr std::size_t longest = 8;
+        return std::hash<std::string_view>{}(key.substr(key.size() - std::min(key.size(), longest))) +
+               key.size();
+    }
+};
+
+using Forms = std::unordered_map<std::string_view, PropertyForm, EndHash>;
 
 Forms formsOf(std::span<const PropertyKey> keys) {
     Forms forms;

@@ -96,6 +96,15 @@ Result<std::string> digestOfSnapshot(const Value& root) {
     return hexadecimalText(hash.digest());
 }
 
+Result<Done> sealSnapshot(const Value& root, MaskSeal seal) {
+    Result<std::string> digest = digestOfSnapshot(root);
+    if (!digest)
+        return Failure{digest.reason()};
+    seal.digest = *std::move(digest);
+    root.asDictionary()->set(descriptionKey, seal.text());
+    return Done{};
+}
+
 std::string digestOfLog(ChunkedInput input) {
     Hash hash;
     if (!input.ensure(dlfVersionReportSize))

@@ -17,6 +17,8 @@ namespace velmora {
 /// All of the file is read.
 [[nodiscard]] std::optional<MaskSeal> readSeal(ChunkedInput input);
 
+/// Makes the seal, with the digest, the description of a snapshot.
+[[nodiscard]] Result<Done> sealSnapshot(const Value& root, MaskSeal seal);
 /// The digest of a snapshot: of all but its description.
 [[nodiscard]] Result<std::string> digestOfSnapshot(const Value& root);
 /// The digest of a DLF log: of all after its version report.

@@ -86,14 +86,21 @@ std::optional<RecordCandidate> RecordCandidate::read(Bytes bytes, Framing framin
     candidate.code = header.u16(LogMessage::codeOffset - typeSize);
     candidate.timestamp = header.u64(LogMessage::timestampOffset - typeSize);
     candidate.score = *framingScore + timestampScore(candidate.timestamp, nearby, weights);
-    const bool isExtra = framingSize != 0 && bytes[framingSize - 1] == LogMessage::extraType;
+    const std::uint8_t type = framingSize != 0 ? bytes[framingSize - 1] : impliedType(candidate.code);
+    const bool isExtra = type == LogMessage::extraType;
     const std::uint32_t logCode = (isExtra ? LogMessage::firstExtraCode : 0) + candidate.code;
     if (candidate.isVersionReport())
         candidate.score += weights.versionReport;
     // Zeros that count as no time do not count as a code of the extra stream besides.
     else if (technologiesOfCode(logCode) != 0 && (candidate.code | candidate.timestamp) != 0)
-        candidate.score += weights.wantedCode;
+        // Without a type byte small numbers are all that there is of the extra stream's codes.
+        candidate.score +=
+            framing == Framing::Nothing && isExtra ? weights.wantedCode / 2 : weights.wantedCode;
     return candidate;
+}
+
+bool RecordCandidate::hasTime() const {
+    return timestamp != 0 && isRecordTime(timestamp);
 }
 
 bool RecordCandidate::isVersionReport() const {

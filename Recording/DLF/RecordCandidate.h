@@ -47,6 +47,8 @@ struct RecordCandidate {
     read(Bytes bytes, Framing framing, std::optional<std::uint64_t> nearby, const RecordWeights& weights);
 
     [[nodiscard]] int total() const { return score + followerScore; }
+    /// Whether its time stamp denotes a time; 0 does not.
+    [[nodiscard]] bool hasTime() const;
     [[nodiscard]] bool isVersionReport() const;
     /// The first byte of the message that is missing in the input; none where it is all there.
     [[nodiscard]] std::optional<std::uint8_t> missingByte() const;

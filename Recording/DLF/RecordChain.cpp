@@ -25,7 +25,7 @@ bool RecordChain::looksLikeRecords() {
     if (_input.ensure(std::size(report)))
         for (std::size_t i = 0; i < std::size(report); ++i)
             right += _input.available()[i] == report[i];
-    return right + 1 >= std::size(report) || isConvincingAt(0, _weights.sure);
+    return right + 1 >= std::size(report) || isConvincingAt(0, _weights.sure, _timestamp);
 }
 
 std::optional<RecordChain::Record> RecordChain::next() {
@@ -56,7 +56,7 @@ RecordChain::Survey RecordChain::survey() {
         std::optional<RecordCandidate> candidate = candidateAt(0, framing, _timestamp);
         if (!candidate)
             continue;
-        const bool isWhole = scoreFollower(0, *candidate);
+        const bool isWhole = scoreFollower(0, *candidate, _timestamp);
         if (isWhole && candidate->followerScore >= _weights.goodFollower &&
             candidate->total() >= _weights.expected)
             keepBetter(found.linked, *candidate);
@@ -84,29 +84,30 @@ int RecordChain::scoreAt(std::size_t at, std::optional<std::uint64_t> nearby) {
     return most;
 }
 
-/// Scores what follows the candidate at `at`. False if that is past the end of the input.
-bool RecordChain::scoreFollower(std::size_t at, RecordCandidate& candidate) {
+/// Scores what follows the candidate at `at`; `nearby` is for one without a time of its own. False if that is
+/// past the end of the input.
+bool RecordChain::scoreFollower(std::size_t at, RecordCandidate& candidate,
+                                std::optional<std::uint64_t> nearby) {
     const std::size_t end = at + candidate.size;
     if (!_input.ensure(end))
         return false;
-    const bool hasTime = candidate.timestamp != 0 && isRecordTime(candidate.timestamp);
     candidate.followerScore = _input.ensure(end + 1)
-                                  ? scoreAt(end, hasTime ? candidate.timestamp : _timestamp)
+                                  ? scoreAt(end, candidate.hasTime() ? candidate.timestamp : nearby)
                                   : _weights.endOfInput;
     return true;
 }
 
 /// Whether a record surely begins at `at`, where none is expected.
-bool RecordChain::isConvincingAt(std::size_t at, int least) {
+bool RecordChain::isConvincingAt(std::size_t at, int least, std::optional<std::uint64_t> nearby) {
     for (const Framing framing : allFramings) {
         // Any byte before a record's type may be half a prefix, and any byte is a type of no stream.
         if (framing == Framing::PartialPrefix || framing == Framing::OtherType)
             continue;
-        std::optional<RecordCandidate> candidate = candidateAt(at, framing, _timestamp);
+        std::optional<RecordCandidate> candidate = candidateAt(at, framing, nearby);
         // Any two bytes may be a length: what they lead to is read only with some score.
         if (!candidate || (framing == Framing::Nothing && candidate->score < 0))
             continue;
-        if (scoreFollower(at, *candidate) && candidate->followerScore >= _weights.goodFollower &&
+        if (scoreFollower(at, *candidate, nearby) && candidate->followerScore >= _weights.goodFollower &&
             candidate->total() >= least)
             return true;
     }
@@ -118,8 +119,14 @@ bool RecordChain::containsBetterRecord(const RecordCandidate& candidate) {
     // Where another record follows, the candidate's last bytes may look like that record's framing.
     const std::size_t margin = candidate.followerScore >= _weights.goodFollower ? sizeOf(Framing::Prefix) : 0;
     const int least = std::max(_weights.sure, candidate.total() + 1);
+    // Where no record has had a time yet, the candidate's counts for what has bytes of its own for a time:
+    // zeros in a payload would otherwise be more likely a record's stamp than the time of the record that
+    // they are in.
+    const bool isFirstTime =
+        _timestamp.value_or(0) == 0 && candidate.hasTime() && candidate.score >= _weights.goodFollower;
+    const std::size_t ownTime = sizeOf(candidate.framing) + sizeof candidate.timestamp;
     for (std::size_t at = 1; at + margin < candidate.size; ++at) {
-        if (isConvincingAt(at, least))
+        if (isConvincingAt(at, least, isFirstTime && at >= ownTime ? candidate.timestamp : _timestamp))
             return true;
     }
     return false;
@@ -156,7 +163,7 @@ void RecordChain::skipDamage(const Survey& survey) {
     bool found = false;
     while (!found && _input.ensure(1)) {
         _input.skip(1);
-        found = _input.ensure(1) && isConvincingAt(0, _weights.sure);
+        found = _input.ensure(1) && isConvincingAt(0, _weights.sure, _timestamp);
     }
     loss.bytes = _input.offset() - loss.offset;
     const std::optional<RecordCandidate>& header = survey.plain ? survey.plain : survey.truncated;

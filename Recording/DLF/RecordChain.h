@@ -67,8 +67,9 @@ private:
     [[nodiscard]] std::optional<RecordCandidate> candidateAt(std::size_t at, Framing framing,
                                                              std::optional<std::uint64_t> nearby);
     [[nodiscard]] int scoreAt(std::size_t at, std::optional<std::uint64_t> nearby);
-    [[nodiscard]] bool scoreFollower(std::size_t at, RecordCandidate& candidate);
-    [[nodiscard]] bool isConvincingAt(std::size_t at, int least);
+    [[nodiscard]] bool scoreFollower(std::size_t at, RecordCandidate& candidate,
+                                     std::optional<std::uint64_t> nearby);
+    [[nodiscard]] bool isConvincingAt(std::size_t at, int least, std::optional<std::uint64_t> nearby);
     [[nodiscard]] bool containsBetterRecord(const RecordCandidate& candidate);
     [[nodiscard]] Survey survey();
     [[nodiscard]] Record take(const RecordCandidate& candidate);

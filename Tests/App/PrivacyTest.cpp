@@ -1,6 +1,9 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
+#include "App/PrivacySwitch.h"
+#include "Export/Masking/SealedFile.h"
+#include "Recording/Files/FileSource.h"
 #include "Tests/App/SaveScreenFixture.h"
 
 #include <QAbstractButton>
@@ -164,6 +167,45 @@ TEST_F(PrivacyTest, SnapshotsHoldNothingThatWasReceivedInClear) {
     EXPECT_THAT(text, HasSubstr("-71 dBm"));
     EXPECT_THAT(text, Not(HasSubstr(iccid)));
     EXPECT_THAT(text, Not(HasSubstr(address)));
+}
+
+TEST_F(PrivacyTest, SnapshotsHaveTheSealOfMaskedFilesInsteadOfWhatIsTyped) {
+    MaskKey key;
+    key.bytes.fill(7);
+    app.setMaskKey(key);
+    platform.fakePreferences.trueOnes = {preference};
+    launchAndConnect();
+    show(identities());
+    open();
+    saveScreen()->saveDescription().setText("Anna's phone");
+    save();
+    ASSERT_EQ(files().size(), 1U);
+    const std::filesystem::path path = directory / "logs" / files()[0];
+    Result<std::unique_ptr<ByteSource>> source = FileSource::open(path.string());
+    ASSERT_TRUE(source);
+    const std::optional<MaskSeal> seal = readSeal(ChunkedInput(*std::move(source)));
+    ASSERT_TRUE(seal);
+    EXPECT_EQ(seal->level, MaskLevel::Identity);
+    EXPECT_EQ(seal->key, key.fingerprint());
+    std::ifstream stream(path);
+    const std::string text(std::istreambuf_iterator<char>(stream), {});
+    EXPECT_THAT(text, Not(HasSubstr("Anna")));
+}
+
+TEST_F(PrivacyTest, SnapshotsOfMessagesInClearHaveNoSeal) {
+    platform.fakePreferences.trueOnes = {preference};
+    launchAndConnect();
+    pressCtrlM();
+    reconnect();
+    show(identities());
+    open();
+    saveScreen()->saveDescription().setText("Anna's phone");
+    save();
+    ASSERT_EQ(files().size(), 1U);
+    std::ifstream stream(directory / "logs" / files()[0]);
+    const std::string text(std::istreambuf_iterator<char>(stream), {});
+    EXPECT_THAT(text, HasSubstr("Anna's phone"));
+    EXPECT_THAT(text, Not(HasSubstr("velmora-mask")));
 }
 
 TEST_F(PrivacyTest, SaveScreenWithWhatWasReceivedInClearIsClosed) {

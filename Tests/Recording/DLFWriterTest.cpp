@@ -138,6 +138,25 @@ TEST_F(DLFWriterTest, whatItWritesIsReadAgain) {
     EXPECT_THAT(out.losses, IsEmpty());
 }
 
+TEST_F(DLFWriterTest, recordsWhosePayloadResemblesARecordAreReadAgain) {
+    // The last byte of today's time stamps is 01, as a type is. With it these payloads are records
+    // themselves, which end where the log ends.
+    for (const char* payload : {"0C000000 0000000000000000", "0D000000 000000000000000001",
+                                "0C00FF00 0000000000000000", "10000000 0000000000000000 00000000"})
+        for (std::uint16_t code = 0; code <= 7; ++code) {
+            _medium = FakeOutputFile();
+            const auto writer = make();
+            const Data message = stampedRecord(code, payload, stampAfter(code), 0xFF);
+            ASSERT_EQ(message.bytes()[12], 1);
+            ASSERT_TRUE(writer->append(message.bytes()));
+            ASSERT_TRUE(writer->close());
+            const ReadOut out = readAnyForm(Data::copyOf(_medium.content));
+            EXPECT_THAT(out.losses, IsEmpty()) << payload << ", " << code;
+            ASSERT_EQ(out.messages.size(), 1U) << payload << ", " << code;
+            EXPECT_TRUE(out.messages[0].ends_with(": " + hexText(message.bytes()))) << out.messages[0];
+        }
+}
+
 TEST_F(DLFWriterTest, repeatsAFailure) {
     _medium.room = 170;
     const auto writer = make();

@@ -71,7 +71,7 @@ Result<Done> sealLog(const AtomicFile& file, MaskSeal seal) {
     return written == static_cast<::ssize_t>(bytes.size()) ? Result<Done>(Done{}) : Failure{errnoText(errno)};
 }
 
-Result<Done> sealSnapshot(const AtomicFile& file, MaskSeal seal) {
+Result<Done> sealSnapshotFile(const AtomicFile& file, MaskSeal seal) {
     constexpr std::size_t largestSnapshot = std::size_t{256} << 20;
     const Result<Data> content = readFile(file.path(), largestSnapshot);
     if (!content)
@@ -80,11 +80,8 @@ Result<Done> sealSnapshot(const AtomicFile& file, MaskSeal seal) {
         content->bytes(), {.maximumObjects = ~std::size_t{0}, .maximumMemory = ~std::size_t{0}});
     if (!root || !root->asDictionary())
         return Failure{root ? "no dictionary" : root.reason()};
-    Result<std::string> digest = digestOfSnapshot(*root);
-    if (!digest)
-        return Failure{digest.reason()};
-    seal.digest = *std::move(digest);
-    root->asDictionary()->set("Description", seal.text());
+    if (Result<Done> sealed = sealSnapshot(*root, std::move(seal)); !sealed)
+        return sealed;
     const Result<std::string> list = writePropertyList(*root);
     if (!list)
         return Failure{list.reason()};
@@ -117,7 +114,7 @@ Result<bool> maskMessages(MessageReader& reader, const MaskCommandOptions& optio
         return converted;
     const MaskSeal seal = sealOf(mask.options());
     if (const auto sealed =
-            conversion.form == FileForm::DLFLog ? sealLog(file, seal) : sealSnapshot(file, seal);
+            conversion.form == FileForm::DLFLog ? sealLog(file, seal) : sealSnapshotFile(file, seal);
         !sealed)
         return Failure{options.out + ": " + sealed.reason()};
     return converted;

@@ -13,7 +13,7 @@ RuleProgress::Outcome RuleProgress::step(Time now, const RuleValue& when, const 
 void RuleProgress::reset() {
     _isActive = false;
     _begin.reset();
-    _isConfirmed = false;
+    _confirmed.reset();
     _end.reset();
     _unknown.reset();
 }
@@ -47,13 +47,14 @@ RuleProgress::Outcome RuleProgress::stepIdle(Time now, const RuleValue& when, co
         return Outcome::Starts;
     }
     if (isConfirming && now > *_begin)
-        _isConfirmed = true;
+        _confirmed = now;
     if (now - *_begin < _rule.holdFor) {
         wakeup.by(*_begin + _rule.holdFor);
         return Outcome::Nothing;
     }
-    // One measurement, which stays known for some seconds, does not show what lasts.
-    if (!_isConfirmed && _rule.holdFor > Time::duration::zero())
+    // What was measured once, or only at first, stays known for some seconds and does not show what lasts.
+    const bool isMeasured = _confirmed && *_confirmed + Rule::longestUnmeasured >= *_begin + _rule.holdFor;
+    if (!isMeasured && _rule.holdFor > Time::duration::zero())
         return Outcome::Nothing; // until a report
     _isActive = true;
     _end.reset();

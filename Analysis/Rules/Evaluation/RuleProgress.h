@@ -50,10 +50,10 @@ private:
 
     const Rule& _rule;
     bool _isActive = false;
-    std::optional<Time> _begin;   ///< since when `when` has held
-    bool _isConfirmed = false;    ///< by a report after `_begin`
-    std::optional<Time> _end;     ///< since when what ends the event has held
-    std::optional<Time> _unknown; ///< since when the condition has been unknown
+    std::optional<Time> _begin;     ///< since when `when` has held
+    std::optional<Time> _confirmed; ///< when a report after `_begin` did so last
+    std::optional<Time> _end;       ///< since when what ends the event has held
+    std::optional<Time> _unknown;   ///< since when the condition has been unknown
 };
 
 } // namespace velmora

@@ -70,7 +70,7 @@ TEST_F(RuleTimingTest, AnEventLastsWhileTheConditionHolds) {
 TEST_F(RuleTimingTest, ForDelaysTheReportAndNotTheBegin) {
     use("when = \"serving.level < -110\"\nfor = \"5s\"");
     level(1, -111);
-    level(2, -112);
+    level(4.5, -112);
     other(5.9);
     EXPECT_THAT(sink.begun, IsEmpty());
     other(6);
@@ -98,6 +98,26 @@ TEST_F(RuleTimingTest, ForNeedsASecondMeasurement) {
     other(7);
     EXPECT_THAT(sink.begun, IsEmpty());
     level(8, -111);
+    EXPECT_THAT(sink.begun, ElementsAre("weak 1"));
+}
+
+TEST_F(RuleTimingTest, ForNeedsAMeasurementInItsLastTwoSeconds) {
+    use("when = \"serving.level < -110\"\nfor = \"5s\"");
+    level(1, -111);
+    level(2, -112);
+    level(3.9, -112);
+    other(6);
+    other(7);
+    EXPECT_THAT(sink.begun, IsEmpty());
+    level(8, -111);
+    EXPECT_THAT(sink.begun, ElementsAre("weak 1"));
+}
+
+TEST_F(RuleTimingTest, AMeasurementTwoSecondsBeforeForIsOverIsEnough) {
+    use("when = \"serving.level < -110\"\nfor = \"5s\"");
+    level(1, -111);
+    level(4, -112);
+    other(6);
     EXPECT_THAT(sink.begun, ElementsAre("weak 1"));
 }
 
@@ -248,6 +268,7 @@ TEST_F(RuleTimingTest, ATimeThatGoesBackALittleCountsAsTheLatest) {
     level(5, -111);
     level(4.5, -111);
     level(5.5, -111);
+    level(8.5, -111);
     other(9.9);
     EXPECT_THAT(sink.begun, IsEmpty());
     other(10);

@@ -58,7 +58,6 @@ KINDS = {
 }
 
 SHOWN_ONLY = {
-    ("poor-quality", "lte"): "the last measurement before a power-off counts for as long as the cell is known",
     ("pilot-pollution", "gsm"): "the levels of serving cell and neighbours are of different times and rounded differently",
     ("pilot-pollution", "lte"): "the levels of serving cell and neighbours are of different times",
 }
