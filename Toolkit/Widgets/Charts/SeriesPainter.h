@@ -37,6 +37,7 @@ public:
 private:
     void drawSamples(const ChartSeries& series, std::size_t begin, std::size_t end);
     void drawColumns(const ChartSeries& series, std::size_t end);
+    void drawJoints(ChartLine line);
     void addColumn(const ChartSeries& series, std::size_t column, const SampleColumn* previous);
     [[nodiscard]] double y(double value) const { return yAt(value, _plot, _axis); }
 
@@ -49,7 +50,7 @@ private:
     std::vector<bool> _isDash; ///< of a period of the line's pattern, by points; empty for solid lines
     std::vector<SampleColumn> _columns;
     std::vector<QRect> _bars;    ///< in device pixels
-    std::vector<QLineF> _joints; ///< over columns without samples
+    std::vector<QLineF> _joints; ///< between samples, or over columns without any
     std::vector<QPointF> _marks;
 };
 
