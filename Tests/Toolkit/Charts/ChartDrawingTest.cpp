@@ -90,6 +90,21 @@ TEST_F(ChartDrawingTest, LinesOfDashesStillShowEveryExtreme) {
         EXPECT_GT(inkAt(image, xAt(noon_ns - second * second_ns - second_ns / 2)), 30) << second;
 }
 
+TEST_F(ChartDrawingTest, LinesAcrossTheViewToFarSamplesAreDrawn) {
+    const auto rare = store.makeSeries(24 * 3600 * second_ns);
+    ChartPanel dotted = panelOf("Level", rare);
+    dotted.series.front().line = ChartLine::dotted;
+    chart.setPanel(panel, dotted);
+    ASSERT_TRUE(rare->append(noon_ns - 10 * 3600 * second_ns, -90));
+    ASSERT_TRUE(rare->append(noon_ns + 10 * 3600 * second_ns, -90));
+    chart.setRange({noon_ns, noon_ns + second_ns / 100}); // of which the line is a hundred million pixels
+    const QImage image = picture();
+    int columns = 0;
+    for (int x = static_cast<int>(layout().left()); x < 390; ++x)
+        columns += inkAt(image, x) > 0 ? 1 : 0;
+    EXPECT_NEAR(columns, layout().width() / 2, layout().width() / 5); // dashes of 2, spaces of 3
+}
+
 TEST_F(ChartDrawingTest, NothingIsDrawnWhileItIsHidden) {
     addMinute();
     chart.setHidden(true);
