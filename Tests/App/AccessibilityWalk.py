@@ -169,8 +169,9 @@ class Walk:
                 process.wait()
 
 
-walk = Walk(sys.argv[1], sys.argv[2])
-try:
-    walk.run()
-finally:
-    walk.end()
+if __name__ == "__main__":
+    walk = Walk(sys.argv[1], sys.argv[2])
+    try:
+        walk.run()
+    finally:
+        walk.end()

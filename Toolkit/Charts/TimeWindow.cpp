@@ -44,15 +44,14 @@ void TimeWindow::zoom(double factor, std::int64_t fixed_ns, std::optional<std::i
     const TimeRange shown = range(oldest_ns);
     const auto length_ns = static_cast<std::int64_t>(
         std::clamp(static_cast<double>(shown.length_ns()) * factor, double(shortest_ns), double(longest_ns)));
-    if (_isFollowing) {
+    const double share = std::clamp(
+        static_cast<double>(fixed_ns - shown.begin_ns) / static_cast<double>(shown.length_ns()), 0.0, 1.0);
+    if (_isFollowing && (factor >= 1 || share > 0.9)) {
         _span_ns = length_ns;
         return;
     }
-    const double share =
-        static_cast<double>(fixed_ns - shown.begin_ns) / static_cast<double>(shown.length_ns());
     const std::int64_t begin_ns =
-        fixed_ns -
-        static_cast<std::int64_t>(std::llround(std::clamp(share, 0.0, 1.0) * static_cast<double>(length_ns)));
+        fixed_ns - static_cast<std::int64_t>(std::llround(share * static_cast<double>(length_ns)));
     setRange({begin_ns, begin_ns + length_ns});
 }
 

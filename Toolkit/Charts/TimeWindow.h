@@ -32,8 +32,8 @@ public:
 
     /// Moves by a time, positive into the future.
     void pan(std::int64_t by_ns, std::optional<std::int64_t> oldest_ns);
-    /// Makes the range `factor` times as long, with `fixed_ns` staying where it is; while following the end
-    /// stays.
+    /// Makes the range `factor` times as long, with `fixed_ns` staying where it is. A range that follows goes
+    /// on doing so when it gets longer, and when the fixed time is in its last tenth: its end stays then.
     void zoom(double factor, std::int64_t fixed_ns, std::optional<std::int64_t> oldest_ns);
     /// Moves as little as brings the time into view.
     void reveal(std::int64_t time_ns, std::optional<std::int64_t> oldest_ns);

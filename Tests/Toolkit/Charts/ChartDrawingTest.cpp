@@ -20,7 +20,12 @@ protected:
         QApplication::setPalette(QApplication::style()->standardPalette());
         QApplication::setLayoutDirection(Qt::LeftToRight);
     }
-    /// The times that the picture's columns begin at, for one sample in the middle of a column.
+    /// In points.
+    [[nodiscard]] static QColor colorAt(const QImage& image, double x, double y) {
+        const double ratio = image.devicePixelRatio();
+        return image.pixelColor(static_cast<int>(x * ratio), static_cast<int>(y * ratio));
+    }
+    /// The middle of the point that a time lies in.
     [[nodiscard]] double middleOf(std::int64_t time_ns) const { return std::floor(xAt(time_ns)) + 0.5; }
 };
 
@@ -32,12 +37,12 @@ TEST_F(ChartDrawingTest, TheExtremeOfOneSampleAmongAMillionIsDrawnInItsColumn) {
         ASSERT_TRUE(level->append(noon_ns - 60 * second_ns + number * step_ns, number == spike ? -40 : -110));
     chart.samplesChanged();
     const QImage image = picture();
-    const double x = middleOf(noon_ns - 60 * second_ns + spike * step_ns);
+    const double x = xAt(noon_ns - 60 * second_ns + spike * step_ns);
     const double height = layout().panels().front().plot.height();
-    EXPECT_GT(inkAt(image, x), height * 0.6);
+    EXPECT_GT(inkAt(image, x), height * 0.6 * image.devicePixelRatio());
     // Its neighbour joins it to the line, and no other column has more than the level line.
-    EXPECT_LE(inkAt(image, x - 1), 4);
-    EXPECT_LE(inkAt(image, x + 2), 4);
+    EXPECT_LE(inkAt(image, x - 1), 6);
+    EXPECT_LE(inkAt(image, x + 2), 6);
     EXPECT_GE(inkAt(image, x - 20), 1);
 }
 
@@ -82,7 +87,22 @@ TEST_F(ChartDrawingTest, LinesOfDashesStillShowEveryExtreme) {
     chart.samplesChanged();
     const QImage image = picture();
     for (int second = 1; second < 60; second += 3)
-        EXPECT_GT(inkAt(image, middleOf(noon_ns - second * second_ns - second_ns / 2)), 30) << second;
+        EXPECT_GT(inkAt(image, xAt(noon_ns - second * second_ns - second_ns / 2)), 30) << second;
+}
+
+TEST_F(ChartDrawingTest, LinesAcrossTheViewToFarSamplesAreDrawn) {
+    const auto rare = store.makeSeries(24 * 3600 * second_ns);
+    ChartPanel dotted = panelOf("Level", rare);
+    dotted.series.front().line = ChartLine::dotted;
+    chart.setPanel(panel, dotted);
+    ASSERT_TRUE(rare->append(noon_ns - 10 * 3600 * second_ns, -90));
+    ASSERT_TRUE(rare->append(noon_ns + 10 * 3600 * second_ns, -90));
+    chart.setRange({noon_ns, noon_ns + second_ns / 100}); // of which the line is a hundred million pixels
+    const QImage image = picture();
+    int columns = 0;
+    for (int x = static_cast<int>(layout().left()); x < 390; ++x)
+        columns += inkAt(image, x) > 0 ? 1 : 0;
+    EXPECT_NEAR(columns, layout().width() / 2, layout().width() / 5); // dashes of 2, spaces of 3
 }
 
 TEST_F(ChartDrawingTest, NothingIsDrawnWhileItIsHidden) {
@@ -120,6 +140,47 @@ TEST_F(ChartDrawingTest, NothingIsDrawnWhenNothingInTheRangeIsDifferent) {
     chart.samplesChanged();
     runUntilIdle();
     EXPECT_EQ(widget().paintCount(), before + 2);
+}
+
+TEST_F(ChartDrawingTest, BandsAndEventsAreDrawnAgainOnlyWhenTheyAreOthers) {
+    const std::vector<ChartBand> bands = {{0, noon_ns - 30 * second_ns, {}, "LTE", ChartColor::first}};
+    const std::vector<ChartTick> ticks = {{noon_ns - 20 * second_ns, ChartSeverity::critical, "Call lost"}};
+    const QImage without = picture();
+    chart.setBands(bands);
+    chart.setTicks(ticks);
+    EXPECT_NE(picture(), without);
+    runUntilIdle();
+    const std::size_t before = widget().paintCount();
+    chart.setBands(bands);
+    chart.setTicks(ticks);
+    runUntilIdle();
+    EXPECT_EQ(widget().paintCount(), before);
+}
+
+TEST_F(ChartDrawingTest, ABandReachesFromItsBeginToItsEnd) {
+    chart.setBands({{0, noon_ns - 40 * second_ns, noon_ns - 20 * second_ns, "", ChartColor::first}});
+    const QImage image = picture();
+    const auto at = [&](int second) {
+        return colorAt(image, xAt(noon_ns - second * second_ns), layout().lane(0).center().y());
+    };
+    const ChartTheme theme(widget().palette());
+    EXPECT_EQ(at(41), theme.ground());
+    EXPECT_EQ(at(38), theme.band(ChartColor::first));
+    EXPECT_EQ(at(21), theme.band(ChartColor::first));
+    EXPECT_EQ(at(19), theme.ground());
+}
+
+TEST_F(ChartDrawingTest, OfEventsAtOnePlaceTheGravestIsDrawn) {
+    const auto mark = [this](const std::vector<ChartTick>& ticks) {
+        chart.setTicks(ticks);
+        const QImage image = picture();
+        return colorAt(image, xAt(noon_ns - 30 * second_ns), layout().eventMarks().center().y());
+    };
+    const std::int64_t time_ns = noon_ns - 30 * second_ns;
+    const ChartTheme theme(widget().palette());
+    EXPECT_EQ(mark({{time_ns, ChartSeverity::info, ""}}), theme.mark(ChartSeverity::info));
+    EXPECT_EQ(mark({{time_ns, ChartSeverity::critical, ""}, {time_ns + 1, ChartSeverity::info, ""}}),
+              theme.mark(ChartSeverity::critical));
 }
 
 TEST_F(ChartDrawingTest, TimeThatMovesTheRangeByLessThanAPixelDrawsNothing) {
@@ -169,7 +230,7 @@ TEST_F(ChartDrawingTest, APaletteThatChangesIsTakenUp) {
     dark.setColor(QPalette::Base, QColor(10, 11, 12));
     dark.setColor(QPalette::Text, Qt::white);
     QApplication::setPalette(dark);
-    EXPECT_EQ(picture().pixelColor(399, 299), QColor(10, 11, 12));
+    EXPECT_EQ(colorAt(picture(), 399, 299), QColor(10, 11, 12));
 }
 
 TEST_F(ChartDrawingTest, LabelsAreMirroredButTimeIsNot) {

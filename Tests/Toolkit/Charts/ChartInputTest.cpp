@@ -145,12 +145,17 @@ TEST_F(ChartInputTest, TwoFingersZoomAroundTheTimeBetweenThem) {
     EXPECT_EQ(chart.cursor(), std::nullopt);
 }
 
-TEST_F(ChartInputTest, TheWheelZoomsAndWithShiftMoves) {
-    wheel({0, 120});
-    EXPECT_NEAR(seconds(), 40, 0.1);
-    EXPECT_TRUE(chart.isFollowing());
+TEST_F(ChartInputTest, TheWheelZoomsAtThePointerAndWithShiftMoves) {
     wheel({0, -120});
+    EXPECT_NEAR(seconds(), 90, 0.1);
+    EXPECT_TRUE(chart.isFollowing());
+    const std::int64_t fixed_ns = widget().scale().timeAt(200);
+    wheel({0, 120});
     EXPECT_NEAR(seconds(), 60, 0.1);
+    EXPECT_FALSE(chart.isFollowing());
+    EXPECT_NEAR(static_cast<double>(widget().scale().timeAt(200) - fixed_ns) / 1e9, 0, 0.5);
+    key(Qt::Key_N);
+    key(Qt::Key_1);
     wheel({0, 120}, Qt::ShiftModifier);
     EXPECT_FALSE(chart.isFollowing());
     EXPECT_LT(chart.range().end_ns, noon_ns);
@@ -179,6 +184,12 @@ TEST_F(ChartInputTest, KeysChooseTheRange) {
     EXPECT_NEAR(static_cast<double>(noon_ns - chart.range().end_ns) / 1e9, 30, 0.5);
     key(Qt::Key_End);
     EXPECT_TRUE(chart.isFollowing());
+}
+
+TEST_F(ChartInputTest, PlusZoomsAroundTheCursor) {
+    chart.setCursor(noon_ns - 30 * second_ns);
+    key(Qt::Key_Plus);
+    EXPECT_EQ(chart.range(), (TimeRange{noon_ns - 50 * second_ns, noon_ns - 10 * second_ns}));
 }
 
 TEST_F(ChartInputTest, ACursorThatTheProgramSetsIsBroughtIntoView) {

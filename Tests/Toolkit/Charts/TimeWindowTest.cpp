@@ -51,10 +51,19 @@ TEST_F(TimeWindowTest, CannotBeMovedAwayFromAllThatThereIs) {
     EXPECT_EQ(range(), seconds(950, 1050));
 }
 
-TEST_F(TimeWindowTest, ZoomsAroundAPlaceAndWhileFollowingAroundNow) {
-    window.zoom(0.5, 900 * second_ns, oldest_ns);
+TEST_F(TimeWindowTest, GoesOnFollowingWhenItGetsLongerOrIsZoomedNearNow) {
+    window.zoom(0.5, 995 * second_ns, oldest_ns);
     EXPECT_TRUE(window.isFollowing());
     EXPECT_EQ(range(), seconds(950, 1000));
+    window.zoom(4, 960 * second_ns, oldest_ns);
+    EXPECT_TRUE(window.isFollowing());
+    EXPECT_EQ(range(), seconds(800, 1000));
+}
+
+TEST_F(TimeWindowTest, ZoomsAroundAPlace) {
+    window.zoom(0.5, 950 * second_ns, oldest_ns);
+    EXPECT_FALSE(window.isFollowing());
+    EXPECT_EQ(range(), seconds(925, 975));
     window.setRange(seconds(100, 200));
     window.zoom(2, 125 * second_ns, oldest_ns);
     EXPECT_EQ(range(), seconds(75, 275));

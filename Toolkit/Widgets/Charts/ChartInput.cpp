@@ -31,7 +31,10 @@ void ChartInput::zoom(double factor, double x) {
 
 void ChartInput::zoomByKey(double factor) {
     const TimeRange shown = _chart.model.range();
-    const std::int64_t fixed_ns = _chart.model.cursor_ns.value_or(shown.begin_ns + shown.length_ns() / 2);
+    const auto& cursor_ns = _chart.model.cursor_ns;
+    const std::int64_t otherwise_ns =
+        _chart.model.window.isFollowing() ? shown.end_ns : shown.begin_ns + shown.length_ns() / 2;
+    const std::int64_t fixed_ns = cursor_ns && shown.contains(*cursor_ns) ? *cursor_ns : otherwise_ns;
     _chart.changeWindow([&](TimeWindow& window) { window.zoom(factor, fixed_ns, _chart.model.oldest_ns()); });
 }
 

@@ -15,14 +15,32 @@ namespace {
 
 constexpr double leastPlot = 24;
 
+/// The value of the line between two samples at a time, if one is drawn there.
+std::optional<double> lineAt(const ChartSeries& series, std::int64_t time_ns) {
+    const std::size_t next = series.samples->countBefore(time_ns);
+    if (next == 0 || series.samples->isGapAfter(next - 1))
+        return std::nullopt;
+    const Sample before = series.samples->entry(next - 1);
+    const Sample after = series.samples->entry(next);
+    const double share =
+        static_cast<double>(time_ns - before.time_ns) / static_cast<double>(after.time_ns - before.time_ns);
+    return before.value + (series.isStepped ? 0 : share * (after.value - before.value));
+}
+
 /// Of all series' values in view. The columns' alignment may show a little more at the beginning.
 Extremes extremesOf(const ChartPanel& panel, const TimeRange& range, double width) {
     const auto more_ns =
         static_cast<std::int64_t>(2 * static_cast<double>(range.length_ns()) / std::max(width, 2.0));
     Extremes result;
-    for (const ChartSeries& series : panel.series)
-        if (series.samples)
-            result.add(series.samples->extremes(range.begin_ns - more_ns, range.end_ns + 1));
+    for (const ChartSeries& series : panel.series) {
+        if (!series.samples)
+            continue;
+        result.add(series.samples->extremes(range.begin_ns - more_ns, range.end_ns + 1));
+        // Lines come in from samples before the range and go on to those after it.
+        for (const std::int64_t edge_ns : {range.begin_ns, range.end_ns})
+            if (const auto value = lineAt(series, edge_ns))
+                result.add(*value);
+    }
     return result;
 }
 

@@ -52,7 +52,7 @@ void ChartWidget::setNow(std::int64_t now_ns) {
     if (!isVisible() || !model.window.isFollowing())
         return;
     // In a long range time passes without moving it by a pixel, but a value may have become too old to count.
-    if (scale() != _painted || readingSamples() != _paintedSamples)
+    if (scale() != _shown || readingSamples() != _shownSamples)
         showChanges();
 }
 
@@ -148,6 +148,18 @@ void ChartWidget::fillTable() {
     _table->setAccessibleName(accessibleName().isEmpty() ? tr("Values")
                                                          : tr("Values, %1").arg(accessibleName()));
     _table->fill(model.table(tableRows), model.readingTime_ns());
+    noteShown();
+}
+
+void ChartWidget::noteShown() {
+    _shown = scale();
+    _shownSamples = readingSamples();
+    (void)model.takeChanges(_shown.range());
+}
+
+void ChartWidget::showEvent(QShowEvent* /*event*/) {
+    if (showsTable())
+        fillTable(); // which was left as it was while hidden
 }
 
 void ChartWidget::paintEvent(QPaintEvent* /*event*/) {
@@ -156,11 +168,9 @@ void ChartWidget::paintEvent(QPaintEvent* /*event*/) {
     const ChartTheme theme(palette());
     painter.fillRect(rect(), theme.ground());
     const ChartLayout layout(model, size(), font(), isRightToLeft());
-    _painted = ChartScale::covering(model.range(), layout.left(), layout.width(), devicePixelRatioF());
-    _paintedSamples = readingSamples();
-    (void)model.takeChanges(_painted.range());
+    noteShown();
     painter.setFont(font());
-    ChartPainter(painter, model, layout, _painted, theme).draw();
+    ChartPainter(painter, model, layout, _shown, theme).draw();
     if (hasFocus() && !showsTable()) {
         QStyleOptionFocusRect option;
         option.initFrom(this);

@@ -55,6 +55,7 @@ protected:
     void mouseMoveEvent(QMouseEvent* event) override;
     void mouseReleaseEvent(QMouseEvent* event) override;
     void resizeEvent(QResizeEvent* event) override;
+    void showEvent(QShowEvent* event) override;
     void changeEvent(QEvent* event) override;
     void focusInEvent(QFocusEvent* event) override;
     void focusOutEvent(QFocusEvent* event) override;
@@ -63,13 +64,14 @@ private:
     /// Draws again, or fills the table again.
     void showChanges();
     void fillTable();
+    void noteShown();
 
     ChartInput _input{*this};
     [[nodiscard]] std::vector<std::optional<Sample>> readingSamples() const;
 
-    // As of the last drawing.
-    ChartScale _painted;
-    std::vector<std::optional<Sample>> _paintedSamples;
+    // As of the last drawing, or of the table's last filling.
+    ChartScale _shown;
+    std::vector<std::optional<Sample>> _shownSamples;
 
     ChartTableWidget* _table = nullptr;
     std::size_t _paintCount = 0;

@@ -4,9 +4,9 @@
 #include "Toolkit/Widgets/Charts/SeriesPainter.h"
 
 #include "Toolkit/Widgets/Charts/ChartTheme.h"
+#include "Toolkit/Widgets/Charts/DashPattern.h"
 
 #include <QPainter>
-#include <QPolygonF>
 
 #include <algorithm>
 #include <cmath>
@@ -19,35 +19,20 @@ constexpr double thickness = 1.6;
 constexpr double markSize = 7;
 constexpr double markDistance = 96;
 
-/// Lengths of dashes and spaces in points, beginning with a dash.
-std::vector<int> dashes(ChartLine line) {
-    switch (line) {
-    case ChartLine::dashed: return {8, 4};
-    case ChartLine::dotted: return {2, 3};
-    case ChartLine::dashDotted: return {8, 3, 2, 3};
-    case ChartLine::solid: break;
-    }
-    return {};
-}
-
-/// For each point of a period of the pattern whether it is in a dash.
-std::vector<bool> dashPoints(ChartLine line) {
-    std::vector<bool> points;
-    bool isDash = true;
-    for (const int length : dashes(line)) {
-        points.insert(points.end(), static_cast<std::size_t>(length), isDash);
-        isDash = !isDash;
-    }
-    return points;
+/// The part of a line between two x. Qt takes long for what is far outside, and so does cutting it to dashes.
+QLineF clipped(QLineF line, double left, double right) {
+    const double width = line.x2() - line.x1();
+    const auto share = [&](double x) { return std::clamp((x - line.x1()) / width, 0.0, 1.0); };
+    return width > 0 ? QLineF(line.pointAt(share(left)), line.pointAt(share(right))) : line;
 }
 
 } // namespace
 
 QPen SeriesPainter::pen(ChartLine line, const QColor& color) {
     QPen pen(color, thickness, Qt::SolidLine, Qt::FlatCap, Qt::BevelJoin);
-    const std::vector<int> lengths = dashes(line);
+    const DashPattern dashes(line);
     QList<qreal> pattern;
-    for (const int length : lengths)
+    for (const double length : dashes.lengths())
         pattern.push_back(length / thickness);
     if (!pattern.isEmpty())
         pen.setDashPattern(pattern);
@@ -84,31 +69,42 @@ void SeriesPainter::drawSamples(const ChartSeries& series, std::size_t begin, st
     const std::size_t first = begin == 0 ? 0 : begin - 1; // the line comes in from the one before
     const std::size_t last = std::min(end + 1, ring.size());
     const bool hasDots = static_cast<double>(end - begin) < _scale.width() / 12;
-    _painter.setRenderHint(QPainter::Antialiasing);
-    QPolygonF line;
+    _joints.clear();
+    _marks.clear();
     for (std::size_t index = first; index < last; ++index) {
         const Sample sample = ring.entry(index);
         if (std::isnan(sample.value))
             continue;
-        // In the middle of its column of pixels, as among many.
         const QPointF place(_scale.xAt(sample.time_ns), y(sample.value));
-        if (series.isStepped && !line.isEmpty())
-            line.push_back({place.x(), line.back().y()});
-        line.push_back(place);
-        const bool isAlone = line.size() == 1 && ring.isGapAfter(index);
-        if (hasDots || isAlone) {
-            _painter.setPen(Qt::NoPen);
-            _painter.setBrush(_color);
-            _painter.drawEllipse(place, 2, 2);
-        }
-        if (!ring.isGapAfter(index) && index + 1 < last)
+        const bool isJoined = index > 0 && !ring.isGapAfter(index - 1);
+        if (hasDots || (!isJoined && ring.isGapAfter(index)))
+            _marks.push_back(place);
+        if (index == first || !isJoined)
             continue;
-        _painter.setPen(pen(series.line, _color));
-        _painter.setBrush(Qt::NoBrush);
-        if (line.size() > 1)
-            _painter.drawPolyline(line);
-        line.clear();
+        const Sample before = ring.entry(index - 1);
+        const QPointF from(_scale.xAt(before.time_ns), y(before.value));
+        const QPointF corner(place.x(), series.isStepped ? from.y() : place.y());
+        _joints.emplace_back(from, corner);
+        if (corner != place)
+            _joints.emplace_back(corner, place);
     }
+    drawJoints(series.line);
+    _painter.setPen(Qt::NoPen);
+    _painter.setBrush(_color);
+    for (const QPointF& dot : _marks)
+        _painter.drawEllipse(dot, 2, 2);
+}
+
+void SeriesPainter::drawJoints(ChartLine line) {
+    for (QLineF& joint : _joints)
+        joint = clipped(joint, _plot.left() - markSize, _plot.right() + markSize);
+    const DashPattern pattern(line);
+    pattern.cut(_joints);
+    // As single lines, since Qt draws these much faster than a polyline of as many; squares at their ends
+    // close the corners.
+    _painter.setRenderHint(QPainter::Antialiasing);
+    _painter.setPen(QPen(_color, thickness, Qt::SolidLine, pattern.isSolid() ? Qt::SquareCap : Qt::FlatCap));
+    _painter.drawLines(_joints.data(), static_cast<int>(_joints.size()));
 }
 
 void SeriesPainter::drawColumns(const ChartSeries& series, std::size_t end) {
@@ -116,12 +112,12 @@ void SeriesPainter::drawColumns(const ChartSeries& series, std::size_t end) {
     _bars.clear();
     _joints.clear();
     _marks.clear();
-    _isDash = dashPoints(series.line);
+    const DashPattern pattern(series.line);
     const SampleColumn* previous = nullptr;
     for (std::size_t column = 0; column < _columns.size(); ++column) {
         if (_columns[column].extremes.isEmpty())
             continue;
-        addColumn(series, column, previous);
+        addColumn(series, pattern, column, previous);
         previous = &_columns[column];
     }
     // The line goes on to the first sample past the end.
@@ -137,16 +133,15 @@ void SeriesPainter::drawColumns(const ChartSeries& series, std::size_t end) {
     _painter.setBrush(_color);
     _painter.drawRects(_bars.data(), static_cast<int>(_bars.size()));
     _painter.restore();
-    _painter.setRenderHint(QPainter::Antialiasing);
-    _painter.setPen(pen(series.line, _color));
-    _painter.drawLines(_joints.data(), static_cast<int>(_joints.size()));
+    drawJoints(series.line);
     _painter.setPen(QPen(_ground, 1.5)); // an edge, by which marks stand out from bars of their own colour
     _painter.setBrush(_color);
     for (const QPointF& mark : _marks)
         drawLineMark(_painter, series.line, mark, markSize);
 }
 
-void SeriesPainter::addColumn(const ChartSeries& series, std::size_t column, const SampleColumn* previous) {
+void SeriesPainter::addColumn(const ChartSeries& series, const DashPattern& pattern, std::size_t column,
+                              const SampleColumn* previous) {
     const double ratio = _scale.pixelRatio;
     const SampleColumn& here = _columns[column];
     Extremes drawn = here.extremes;
@@ -172,8 +167,7 @@ void SeriesPainter::addColumn(const ChartSeries& series, std::size_t column, con
     // Where the line is level a dash can be left out without hiding anything.
     const std::int64_t along = _scale.begin_ns / _scale.column_ns + static_cast<std::int64_t>(column);
     const bool isLevel = bottom - top <= std::lround(2 * thickness * ratio);
-    const auto point = static_cast<std::size_t>(std::abs(static_cast<double>(along) / ratio));
-    if (!isLevel || _isDash.empty() || _isDash[point % _isDash.size()])
+    if (!isLevel || pattern.isDashAt(std::abs(static_cast<double>(along) / ratio)))
         _bars.emplace_back(static_cast<int>(std::lround(_scale.left * ratio)) + static_cast<int>(column), top,
                            1, bottom - top);
     const auto distance = static_cast<std::int64_t>(markDistance * ratio);

@@ -20,6 +20,8 @@ class QPen;
 
 namespace velmora {
 
+class DashPattern;
+
 /// Draws the lines of series into a plot: sample by sample where there are few, from the least to the
 /// greatest of each column of pixels where there are many.
 class SeriesPainter {
@@ -37,7 +39,9 @@ public:
 private:
     void drawSamples(const ChartSeries& series, std::size_t begin, std::size_t end);
     void drawColumns(const ChartSeries& series, std::size_t end);
-    void addColumn(const ChartSeries& series, std::size_t column, const SampleColumn* previous);
+    void drawJoints(ChartLine line);
+    void addColumn(const ChartSeries& series, const DashPattern& pattern, std::size_t column,
+                   const SampleColumn* previous);
     [[nodiscard]] double y(double value) const { return yAt(value, _plot, _axis); }
 
     QPainter& _painter;
@@ -46,10 +50,9 @@ private:
     QColor _color;
     QRectF _plot;
     ValueAxis _axis;
-    std::vector<bool> _isDash; ///< of a period of the line's pattern, by points; empty for solid lines
     std::vector<SampleColumn> _columns;
     std::vector<QRect> _bars;    ///< in device pixels
-    std::vector<QLineF> _joints; ///< over columns without samples
+    std::vector<QLineF> _joints; ///< between samples, or over columns without any
     std::vector<QPointF> _marks;
 };
 
