@@ -56,6 +56,7 @@ struct ChartBand {
     std::optional<std::int64_t> end_ns;
     std::string label; ///< "LTE"
     ChartColor color = ChartColor::first;
+    friend bool operator==(const ChartBand&, const ChartBand&) = default;
 };
 
 /// How grave an event is, or that it is a note of the user's. Each has its own mark besides its colour.
@@ -66,6 +67,7 @@ struct ChartTick {
     std::int64_t time_ns = 0;
     ChartSeverity severity = ChartSeverity::info;
     std::string text; ///< "Handover to 1650/23"
+    friend bool operator==(const ChartTick&, const ChartTick&) = default;
 };
 
 /// A series' value at a moment.

@@ -37,11 +37,15 @@ std::size_t ChartView::panelCount() const {
 }
 
 void ChartView::setBands(std::vector<ChartBand> bands) {
+    if (bands == _chart->model.bands)
+        return;
     _chart->model.bands = std::move(bands);
     _chart->contentsChanged();
 }
 
 void ChartView::setTicks(std::vector<ChartTick> ticks) {
+    if (ticks == _chart->model.ticks)
+        return;
     _chart->model.ticks = std::move(ticks);
     _chart->contentsChanged();
 }

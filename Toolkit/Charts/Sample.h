@@ -27,8 +27,8 @@ struct Extremes {
         maximum = value > maximum ? value : maximum;
     }
     void add(const Extremes& others) {
-        add(others.minimum);
-        add(others.maximum);
+        minimum = others.minimum < minimum ? others.minimum : minimum;
+        maximum = others.maximum > maximum ? others.maximum : maximum;
     }
     friend bool operator==(const Extremes&, const Extremes&) = default;
 };

@@ -76,8 +76,9 @@ std::string labelOf(std::int64_t time_ns, std::int64_t step_ns) {
 TimeAxis TimeAxis::covering(const TimeRange& range, std::size_t markLimit) {
     TimeAxis axis;
     const auto limit = static_cast<std::int64_t>(std::max<std::size_t>(markLimit, 1));
-    axis.step_ns = *std::find_if(std::begin(steps_ns), std::end(steps_ns) - 1,
-                                 [&](std::int64_t step) { return range.length_ns() / step < limit; });
+    axis.step_ns = *std::find_if(std::begin(steps_ns), std::end(steps_ns) - 1, [&](std::int64_t step) {
+        return (range.length_ns() + step - 1) / step <= limit;
+    });
     // Round in local time, whose distance from UTC is taken as it is where the range begins.
     const std::int64_t offset_ns = localTime(range.begin_ns).tm_gmtoff * second_ns;
     const std::int64_t local_ns = range.begin_ns + offset_ns;

@@ -19,6 +19,11 @@ double roundStep(double least) {
     return 10 * power;
 }
 
+/// How many multiples of the step are from one number to another.
+double marksBetween(double low, double high, double step) {
+    return std::floor(high / step + 1e-9) - std::ceil(low / step - 1e-9) + 1;
+}
+
 } // namespace
 
 ValueAxis ValueAxis::covering(const Extremes& extremes, std::optional<double> minimum,
@@ -40,21 +45,19 @@ ValueAxis ValueAxis::covering(const Extremes& extremes, std::optional<double> mi
         low = minimum.value_or(middle - half);
         high = std::max(maximum.value_or(middle + half), low + half);
     }
+    // The ends are rounded finely, so that few marks don't leave much of a low plot empty.
+    const double fine = roundStep((high - low) / 10);
     ValueAxis axis;
-    const auto spaces = static_cast<double>(std::max<std::size_t>(markLimit, 2) - 1);
-    double step = roundStep((high - low) / spaces);
-    // Rounding the ends outward may take one more step than there is room for.
-    for (int attempt = 0; attempt < 3; ++attempt) {
-        axis.minimum = minimum ? low : std::floor(low / step + 1e-9) * step;
-        axis.maximum = maximum ? high : std::ceil(high / step - 1e-9) * step;
-        if ((axis.maximum - axis.minimum) / step <= spaces + 1e-9)
-            break;
+    axis.minimum = minimum ? low : std::floor(low / fine + 1e-9) * fine;
+    axis.maximum = maximum ? high : std::ceil(high / fine - 1e-9) * fine;
+    double step = fine;
+    while (marksBetween(axis.minimum, axis.maximum, step) >
+           static_cast<double>(std::max<std::size_t>(markLimit, 2)))
         step = roundStep(step * 1.5);
-    }
     axis.decimals = std::clamp(static_cast<int>(std::ceil(-std::log10(step) - 1e-9)), 0, 9);
     const double first = std::ceil(axis.minimum / step - 1e-9);
-    for (double mark = first; mark * step <= axis.maximum + step * 1e-9 && axis.marks.size() <= markLimit;
-         ++mark)
+    const double count = marksBetween(axis.minimum, axis.maximum, step);
+    for (double mark = first; mark < first + count; ++mark)
         axis.marks.push_back(mark * step);
     return axis;
 }

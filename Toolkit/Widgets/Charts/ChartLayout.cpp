@@ -41,7 +41,7 @@ ChartLayout::ChartLayout(const ChartModel& model, const QSizeF& size, const QFon
     double taken = top + bottom;
     for (const auto& [id, panel] : model.panels()) {
         Panel& place = _panels.emplace_back();
-        headers.push_back(placeHeader(model, panel, 0, size.width(), place));
+        headers.push_back(placeHeader(model, panel, 0, size.width() - space, place));
         taken += headers.back() + space;
     }
     const auto count = static_cast<double>(std::max<std::size_t>(_panels.size(), 1));
@@ -100,7 +100,7 @@ double ChartLayout::placeHeader(const ChartModel& model, const ChartPanel& panel
                                    : std::max<std::size_t>(static_cast<std::size_t>(width / entry), 1);
     const double from = isOneLine ? titleWidth : 0;
     const auto place1 = [&](double x, double y, double itsWidth) {
-        return QRectF(_isRightToLeft ? width - x - itsWidth : x, y, itsWidth, _lineHeight);
+        return QRectF(space / 2 + (_isRightToLeft ? width - x - itsWidth : x), y, itsWidth, _lineHeight);
     };
     place.title = place1(0, top, titleWidth);
     const double firstLine = isOneLine ? top : top + _lineHeight;
@@ -109,16 +109,14 @@ double ChartLayout::placeHeader(const ChartModel& model, const ChartPanel& panel
                                        firstLine + _lineHeight * static_cast<double>(index / columns),
                                        entry));
     const std::size_t lines = (count + columns - 1) / columns;
-    return firstLine + _lineHeight * static_cast<double>(std::max<std::size_t>(lines, isOneLine ? 1 : 0)) + 2;
+    // Half a line more, since the topmost label of the axis reaches over the plot.
+    return firstLine +
+           _lineHeight * (static_cast<double>(std::max<std::size_t>(lines, isOneLine ? 1 : 0)) + 0.5);
 }
 
 QRectF ChartLayout::lane(std::size_t number) const {
     const auto index = static_cast<double>(std::min<std::size_t>(number, 3));
     return {_left, index * (_lineHeight + 2), _width, _lineHeight};
-}
-
-QRectF ChartLayout::plots() const {
-    return _panels.empty() ? QRectF() : _panels.front().plot.united(_panels.back().plot);
 }
 
 } // namespace velmora

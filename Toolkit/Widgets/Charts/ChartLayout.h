@@ -34,8 +34,6 @@ public:
     [[nodiscard]] QRectF lane(std::size_t number) const;
     [[nodiscard]] const QRectF& eventMarks() const { return _eventMarks; }
     [[nodiscard]] const QRectF& timeAxis() const { return _timeAxis; }
-    /// All plots with what is between them.
-    [[nodiscard]] QRectF plots() const;
     [[nodiscard]] const DigitText& digits() const { return _digits; }
     [[nodiscard]] bool isRightToLeft() const { return _isRightToLeft; }
 

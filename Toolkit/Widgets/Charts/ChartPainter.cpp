@@ -44,7 +44,7 @@ void ChartPainter::drawPanel(std::size_t index) {
     const ChartPanel& panel = _model.panels()[index].panel;
     const ChartLayout::Panel& place = _layout.panels()[index];
     drawValueAxis(panel, place);
-    SeriesPainter lines(_painter, _scale);
+    SeriesPainter lines(_painter, _scale, _theme.ground());
     for (const ChartSeries& series : panel.series)
         lines.draw(series, _theme.line(series.color), place.plot, place.axis);
     drawLegend(panel, place);

@@ -28,8 +28,10 @@ QColor mixed(const QColor& one, const QColor& other, double shareOfOther) {
     const auto part = [shareOfOther](float a, float b) {
         return static_cast<float>(a * (1 - shareOfOther) + b * shareOfOther);
     };
+    // In the precision of the screen, so that a colour that is read back is the same.
     return QColor::fromRgbF(part(one.redF(), other.redF()), part(one.greenF(), other.greenF()),
-                            part(one.blueF(), other.blueF()));
+                            part(one.blueF(), other.blueF()))
+        .rgb();
 }
 
 } // namespace

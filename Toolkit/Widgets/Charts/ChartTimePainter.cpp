@@ -99,11 +99,10 @@ void ChartPainter::drawCursor() {
         return;
     const double x = std::floor(_scale.xAt(*_model.cursor_ns)) + 0.5;
     _painter.setRenderHint(QPainter::Antialiasing);
-    _painter.setPen(QPen(_theme.text(), 1));
-    const QRectF plots = _layout.plots();
-    _painter.drawLine(QPointF(x, plots.top()), QPointF(x, plots.bottom() + 4));
     for (std::size_t index = 0; index < _layout.panels().size(); ++index) {
         const ChartLayout::Panel& place = _layout.panels()[index];
+        _painter.setPen(QPen(_theme.text(), 1));
+        _painter.drawLine(QPointF(x, place.plot.top()), QPointF(x, place.plot.bottom()));
         for (const ChartSeries& series : _model.panels()[index].panel.series) {
             const auto sample = series.samples ? series.samples->at(*_model.cursor_ns) : std::nullopt;
             if (!sample || sample->value < place.axis.minimum || sample->value > place.axis.maximum)

@@ -5,18 +5,22 @@
 
 #include "Toolkit/Widgets/Accessibility.h"
 #include "Toolkit/Widgets/Charts/ChartPainter.h"
+#include "Toolkit/Widgets/Charts/ChartTableWidget.h"
 #include "Toolkit/Widgets/Conversions.h"
 
 #include <QEvent>
-#include <QHeaderView>
-#include <QKeyEvent>
 #include <QPainter>
 #include <QStyleOptionFocusRect>
-#include <QTableWidget>
 
 #include <utility>
 
 namespace velmora {
+
+namespace {
+
+constexpr std::size_t tableRows = 500;
+
+} // namespace
 
 ChartWidget::ChartWidget() {
     setObjectName("velmora.chart");
@@ -45,8 +49,20 @@ void ChartWidget::setNow(std::int64_t now_ns) {
     if (now_ns == model.window.now_ns())
         return;
     model.window.setNow(now_ns);
-    if (isVisible() && model.window.isFollowing() && scale() != _painted)
+    if (!isVisible() || !model.window.isFollowing())
+        return;
+    // In a long range time passes without moving it by a pixel, but a value may have become too old to count.
+    if (scale() != _shown || readingSamples() != _shownSamples)
         showChanges();
+}
+
+std::vector<std::optional<Sample>> ChartWidget::readingSamples() const {
+    std::vector<std::optional<Sample>> samples;
+    const std::int64_t time_ns = model.readingTime_ns();
+    for (const auto& [id, panel] : model.panels())
+        for (const ChartSeries& series : panel.series)
+            samples.push_back(series.samples ? series.samples->at(time_ns) : std::nullopt);
+    return samples;
 }
 
 void ChartWidget::samplesChanged() {
@@ -109,52 +125,41 @@ void ChartWidget::setShowsTable(bool shows) {
         return;
     const bool hadFocus = hasFocus() || (_table && _table->hasFocus());
     if (!_table) {
-        _table = new QTableWidget(this);
-        _table->setObjectName("velmora.chartTable");
-        _table->setEditTriggers(QAbstractItemView::NoEditTriggers);
-        _table->setSelectionBehavior(QAbstractItemView::SelectRows);
-        _table->setSelectionMode(QAbstractItemView::SingleSelection);
-        _table->verticalHeader()->hide();
-        _table->installEventFilter(this);
+        _table = new ChartTableWidget(this);
+        _table->onClose = [this] { setShowsTable(false); };
+        _table->onChoose = [this](std::int64_t time_ns) {
+            setShowsTable(false);
+            moveCursor(time_ns);
+        };
     }
+    _table->forgetChoice();
     _table->setGeometry(rect());
     _table->setVisible(shows);
-    if (shows)
+    if (shows) {
         fillTable();
+        _table->scrollToItem(_table->currentItem());
+    }
     if (hadFocus)
         (shows ? static_cast<QWidget*>(_table) : this)->setFocus();
     update();
 }
 
 void ChartWidget::fillTable() {
-    const ChartTable table = model.table(500);
-    const int row = _table->currentRow();
-    const int column = _table->currentColumn();
-    _table->setAccessibleName(tr("Values of %1").arg(accessibleName()));
-    _table->clear();
-    _table->setRowCount(static_cast<int>(table.rows.size()));
-    _table->setColumnCount(static_cast<int>(table.columns.size()));
-    QStringList titles;
-    for (const std::string& title : table.columns)
-        titles.push_back(toQt(title));
-    _table->setHorizontalHeaderLabels(titles);
-    for (std::size_t y = 0; y < table.rows.size(); ++y)
-        for (std::size_t x = 0; x < table.rows[y].size(); ++x)
-            _table->setItem(static_cast<int>(y), static_cast<int>(x),
-                            new QTableWidgetItem(toQt(table.rows[y][x])));
-    _table->resizeColumnsToContents();
-    if (_table->rowCount() > 0)
-        _table->setCurrentCell(std::clamp(row, 0, _table->rowCount() - 1), std::max(column, 0));
+    _table->setAccessibleName(accessibleName().isEmpty() ? tr("Values")
+                                                         : tr("Values, %1").arg(accessibleName()));
+    _table->fill(model.table(tableRows), model.readingTime_ns());
+    noteShown();
 }
 
-bool ChartWidget::eventFilter(QObject* watched, QEvent* event) {
-    if (watched != _table || event->type() != QEvent::KeyPress)
-        return false;
-    const int key = static_cast<QKeyEvent*>(event)->key();
-    if (key != Qt::Key_T && key != Qt::Key_Escape)
-        return false;
-    setShowsTable(false);
-    return true;
+void ChartWidget::noteShown() {
+    _shown = scale();
+    _shownSamples = readingSamples();
+    (void)model.takeChanges(_shown.range());
+}
+
+void ChartWidget::showEvent(QShowEvent* /*event*/) {
+    if (showsTable())
+        fillTable(); // which was left as it was while hidden
 }
 
 void ChartWidget::paintEvent(QPaintEvent* /*event*/) {
@@ -163,10 +168,9 @@ void ChartWidget::paintEvent(QPaintEvent* /*event*/) {
     const ChartTheme theme(palette());
     painter.fillRect(rect(), theme.ground());
     const ChartLayout layout(model, size(), font(), isRightToLeft());
-    _painted = ChartScale::covering(model.range(), layout.left(), layout.width(), devicePixelRatioF());
-    (void)model.takeChanges(_painted.range());
+    noteShown();
     painter.setFont(font());
-    ChartPainter(painter, model, layout, _painted, theme).draw();
+    ChartPainter(painter, model, layout, _shown, theme).draw();
     if (hasFocus() && !showsTable()) {
         QStyleOptionFocusRect option;
         option.initFrom(this);

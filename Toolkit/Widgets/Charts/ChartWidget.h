@@ -11,9 +11,9 @@
 
 #include <functional>
 
-class QTableWidget;
-
 namespace velmora {
+
+class ChartTableWidget;
 
 /// Draws a chart's model and lets the user move its range and cursor.
 class ChartWidget : public QWidget {
@@ -44,11 +44,10 @@ public:
     /// How often the chart was drawn.
     [[nodiscard]] std::size_t paintCount() const { return _paintCount; }
     /// Null until it was shown for the first time.
-    [[nodiscard]] QTableWidget* table() const { return _table; }
+    [[nodiscard]] ChartTableWidget* table() const { return _table; }
 
 protected:
     bool event(QEvent* event) override;
-    bool eventFilter(QObject* watched, QEvent* event) override;
     void paintEvent(QPaintEvent* event) override;
     void keyPressEvent(QKeyEvent* event) override;
     void wheelEvent(QWheelEvent* event) override;
@@ -56,6 +55,7 @@ protected:
     void mouseMoveEvent(QMouseEvent* event) override;
     void mouseReleaseEvent(QMouseEvent* event) override;
     void resizeEvent(QResizeEvent* event) override;
+    void showEvent(QShowEvent* event) override;
     void changeEvent(QEvent* event) override;
     void focusInEvent(QFocusEvent* event) override;
     void focusOutEvent(QFocusEvent* event) override;
@@ -64,10 +64,16 @@ private:
     /// Draws again, or fills the table again.
     void showChanges();
     void fillTable();
+    void noteShown();
 
     ChartInput _input{*this};
-    ChartScale _painted; ///< as of the last drawing
-    QTableWidget* _table = nullptr;
+    [[nodiscard]] std::vector<std::optional<Sample>> readingSamples() const;
+
+    // As of the last drawing, or of the table's last filling.
+    ChartScale _shown;
+    std::vector<std::optional<Sample>> _shownSamples;
+
+    ChartTableWidget* _table = nullptr;
     std::size_t _paintCount = 0;
 };
 

@@ -6,7 +6,6 @@
 #include "Toolkit/Widgets/Charts/ChartTheme.h"
 
 #include <QPainter>
-#include <QPolygonF>
 
 #include <algorithm>
 #include <cmath>
@@ -16,7 +15,7 @@ namespace velmora {
 namespace {
 
 constexpr double thickness = 1.6;
-constexpr double markSize = 6;
+constexpr double markSize = 7;
 constexpr double markDistance = 96;
 
 /// Lengths of dashes and spaces in points, beginning with a dash.
@@ -30,19 +29,15 @@ std::vector<int> dashes(ChartLine line) {
     return {};
 }
 
-/// Whether a place along the line is in a space between dashes.
-bool isSpace(ChartLine line, std::int64_t along) {
-    const std::vector<int> lengths = dashes(line);
-    int period = 0;
-    for (const int length : lengths)
-        period += length;
-    if (period == 0)
-        return false;
-    auto rest = static_cast<int>(along % period);
-    for (std::size_t index = 0; index < lengths.size(); rest -= lengths[index], ++index)
-        if (rest < lengths[index])
-            return index % 2 == 1;
-    return false;
+/// For each point of a period of the pattern whether it is in a dash.
+std::vector<bool> dashPoints(ChartLine line) {
+    std::vector<bool> points;
+    bool isDash = true;
+    for (const int length : dashes(line)) {
+        points.insert(points.end(), static_cast<std::size_t>(length), isDash);
+        isDash = !isDash;
+    }
+    return points;
 }
 
 } // namespace
@@ -88,31 +83,41 @@ void SeriesPainter::drawSamples(const ChartSeries& series, std::size_t begin, st
     const std::size_t first = begin == 0 ? 0 : begin - 1; // the line comes in from the one before
     const std::size_t last = std::min(end + 1, ring.size());
     const bool hasDots = static_cast<double>(end - begin) < _scale.width() / 12;
-    _painter.setRenderHint(QPainter::Antialiasing);
-    QPolygonF line;
+    _joints.clear();
+    _marks.clear();
     for (std::size_t index = first; index < last; ++index) {
         const Sample sample = ring.entry(index);
         if (std::isnan(sample.value))
             continue;
-        // In the middle of its column of pixels, as among many.
         const QPointF place(_scale.xAt(sample.time_ns), y(sample.value));
-        if (series.isStepped && !line.isEmpty())
-            line.push_back({place.x(), line.back().y()});
-        line.push_back(place);
-        const bool isAlone = line.size() == 1 && ring.isGapAfter(index);
-        if (hasDots || isAlone) {
-            _painter.setPen(Qt::NoPen);
-            _painter.setBrush(_color);
-            _painter.drawEllipse(place, 2, 2);
-        }
-        if (!ring.isGapAfter(index) && index + 1 < last)
+        const bool isJoined = index > 0 && !ring.isGapAfter(index - 1);
+        if (hasDots || (!isJoined && ring.isGapAfter(index)))
+            _marks.push_back(place);
+        if (index == first || !isJoined)
             continue;
-        _painter.setPen(pen(series.line, _color));
-        _painter.setBrush(Qt::NoBrush);
-        if (line.size() > 1)
-            _painter.drawPolyline(line);
-        line.clear();
+        const Sample before = ring.entry(index - 1);
+        const QPointF from(_scale.xAt(before.time_ns), y(before.value));
+        const QPointF corner(place.x(), series.isStepped ? from.y() : place.y());
+        _joints.emplace_back(from, corner);
+        if (corner != place)
+            _joints.emplace_back(corner, place);
     }
+    drawJoints(series.line);
+    _painter.setPen(Qt::NoPen);
+    _painter.setBrush(_color);
+    for (const QPointF& dot : _marks)
+        _painter.drawEllipse(dot, 2, 2);
+}
+
+void SeriesPainter::drawJoints(ChartLine line) {
+    // As single lines, since Qt draws these much faster than a polyline of as many; squares at their ends
+    // close the corners.
+    QPen drawn = pen(line, _color);
+    if (line == ChartLine::solid)
+        drawn.setCapStyle(Qt::SquareCap);
+    _painter.setRenderHint(QPainter::Antialiasing);
+    _painter.setPen(drawn);
+    _painter.drawLines(_joints.data(), static_cast<int>(_joints.size()));
 }
 
 void SeriesPainter::drawColumns(const ChartSeries& series, std::size_t end) {
@@ -120,6 +125,7 @@ void SeriesPainter::drawColumns(const ChartSeries& series, std::size_t end) {
     _bars.clear();
     _joints.clear();
     _marks.clear();
+    _isDash = dashPoints(series.line);
     const SampleColumn* previous = nullptr;
     for (std::size_t column = 0; column < _columns.size(); ++column) {
         if (_columns[column].extremes.isEmpty())
@@ -140,10 +146,8 @@ void SeriesPainter::drawColumns(const ChartSeries& series, std::size_t end) {
     _painter.setBrush(_color);
     _painter.drawRects(_bars.data(), static_cast<int>(_bars.size()));
     _painter.restore();
-    _painter.setRenderHint(QPainter::Antialiasing);
-    _painter.setPen(pen(series.line, _color));
-    _painter.drawLines(_joints.data(), static_cast<int>(_joints.size()));
-    _painter.setPen(Qt::NoPen);
+    drawJoints(series.line);
+    _painter.setPen(QPen(_ground, 1.5)); // an edge, by which marks stand out from bars of their own colour
     _painter.setBrush(_color);
     for (const QPointF& mark : _marks)
         drawLineMark(_painter, series.line, mark, markSize);
@@ -175,7 +179,8 @@ void SeriesPainter::addColumn(const ChartSeries& series, std::size_t column, con
     // Where the line is level a dash can be left out without hiding anything.
     const std::int64_t along = _scale.begin_ns / _scale.column_ns + static_cast<std::int64_t>(column);
     const bool isLevel = bottom - top <= std::lround(2 * thickness * ratio);
-    if (!isLevel || !isSpace(series.line, static_cast<std::int64_t>(static_cast<double>(along) / ratio)))
+    const auto point = static_cast<std::size_t>(std::abs(static_cast<double>(along) / ratio));
+    if (!isLevel || _isDash.empty() || _isDash[point % _isDash.size()])
         _bars.emplace_back(static_cast<int>(std::lround(_scale.left * ratio)) + static_cast<int>(column), top,
                            1, bottom - top);
     const auto distance = static_cast<std::int64_t>(markDistance * ratio);

@@ -24,7 +24,8 @@ namespace velmora {
 /// greatest of each column of pixels where there are many.
 class SeriesPainter {
 public:
-    SeriesPainter(QPainter& painter, const ChartScale& scale) : _painter(painter), _scale(scale) {}
+    SeriesPainter(QPainter& painter, const ChartScale& scale, const QColor& ground)
+        : _painter(painter), _scale(scale), _ground(ground) {}
 
     void draw(const ChartSeries& series, const QColor& color, const QRectF& plot, const ValueAxis& axis);
 
@@ -36,17 +37,20 @@ public:
 private:
     void drawSamples(const ChartSeries& series, std::size_t begin, std::size_t end);
     void drawColumns(const ChartSeries& series, std::size_t end);
+    void drawJoints(ChartLine line);
     void addColumn(const ChartSeries& series, std::size_t column, const SampleColumn* previous);
     [[nodiscard]] double y(double value) const { return yAt(value, _plot, _axis); }
 
     QPainter& _painter;
     const ChartScale& _scale;
+    QColor _ground;
     QColor _color;
     QRectF _plot;
     ValueAxis _axis;
+    std::vector<bool> _isDash; ///< of a period of the line's pattern, by points; empty for solid lines
     std::vector<SampleColumn> _columns;
     std::vector<QRect> _bars;    ///< in device pixels
-    std::vector<QLineF> _joints; ///< over columns without samples
+    std::vector<QLineF> _joints; ///< between samples, or over columns without any
     std::vector<QPointF> _marks;
 };
 
