@@ -7,6 +7,10 @@
 #include "App/DriveView/DriveText.h"
 #include "App/DriveView/NeighbourRows.h"
 
+#include <algorithm>
+#include <cmath>
+#include <utility>
+
 namespace velmora {
 
 namespace {
@@ -66,7 +70,7 @@ void DriveView::updateCharts(Time now) {
 
 void DriveView::layoutSubviews() {
     const double width = contentWidth();
-    const double heading = sizeOfText("X", _neighboursHeading.font()).height + gap;
+    const double heading = std::ceil(sizeOfText("X", _neighboursHeading.font()).height) + gap;
     double charts = _charts.wantedHeight(width);
     double events = _events.heightOfRows(eventRowsShown);
     const double above =

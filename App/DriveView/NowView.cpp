@@ -6,6 +6,9 @@
 #include "App/DriveView/DriveText.h"
 #include "App/DriveView/LabelText.h"
 
+#include <algorithm>
+#include <cmath>
+
 namespace velmora {
 
 namespace {
@@ -17,7 +20,7 @@ constexpr double technologySize = 20;
 constexpr double numberSize = 34;
 
 double lineOf(const Font& font) {
-    return sizeOfText("X", font).height;
+    return std::ceil(sizeOfText("X", font).height);
 }
 
 double captionLine() {
