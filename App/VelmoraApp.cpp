@@ -3,12 +3,14 @@
 
 #include "App/VelmoraApp.h"
 
+#include "App/DriveView/DriveScreen.h"
 #include "App/MaskingModel.h"
 #include "App/VelmoraPaneController.h"
 #include "App/VelmoraSaveViewController.h"
 #include "Model/NodePath.h"
 #include "Platform/SystemLog.h"
 #include "Toolkit/Navigation/NavigationController.h"
+#include "Toolkit/Navigation/SplitController.h"
 #include "Toolkit/Screen.h"
 #include "Toolkit/Window.h"
 
@@ -26,6 +28,8 @@ constexpr const char* homeScreenDomain = "com.velmora.HomeScreen";
 constexpr const char* showGSMRSSIKey = "LantheShowGSMRSSI";
 constexpr const char* connecting = "Connecting...";
 constexpr char privacyKey = 'M';
+constexpr char driveKey = 'D';
+constexpr char pinKey = 'P';
 constexpr const char* maskedNotice = "Identities are masked. Ctrl-M shows them.";
 
 } // namespace
@@ -37,8 +41,10 @@ VelmoraApp::VelmoraApp(int& argc, char** argv, const PlatformMaker& makePlatform
 
 VelmoraApp::~VelmoraApp() {
     // A retry that is due holds the model beyond this; the ports do not stay open for it.
-    if (_model)
-        _model->destroyPorts();
+    if (!_model)
+        return;
+    _model->destroyPorts();
+    _model->setDrive(nullptr);
 }
 
 void VelmoraApp::applicationDidFinishLaunching(Application&) {
@@ -46,6 +52,8 @@ void VelmoraApp::applicationDidFinishLaunching(Application&) {
     _window = std::make_shared<Window>(Screen::mainBounds());
     _privacy = std::make_unique<PrivacySwitch>(_platform->preferences(), _maskKey);
     _model = std::make_shared<MaskingModel>(_platform->model(), this, *_privacy);
+    _drive = std::make_unique<DriveScreen>(*_platform, [this] { return _model && _model->isConnected(); });
+    _model->setDrive(&_drive->model());
     setUpdateMessage(connecting);
     _dateFormatter =
         std::make_unique<DateFormatter>(_platform->model().clock, "'Updated' yyyy-MM-dd 'at' HH:mm:ss");
@@ -53,8 +61,12 @@ void VelmoraApp::applicationDidFinishLaunching(Application&) {
     rootPane->setStatus("Connecting", true);
     _navController = std::make_shared<NavigationController>(rootPane);
     _navController->setDelegate(this);
-    _window->setRootViewController(_navController);
+    _window->setRootViewController(_drive->standBeside(_navController));
+    if (_beginsWithDrive)
+        _drive->open();
     _window->setCommand(privacyKey, [this] { togglePrivacy(); });
+    _window->setCommand(driveKey, [this] { _drive->toggle(); });
+    _window->setCommand(pinKey, [this] { pinFocusRow(); });
     updateNotice();
     _window->makeKeyAndVisible();
     // The screen is up before the first exchange with the telephony service, which blocks. The display's
@@ -81,7 +93,12 @@ void VelmoraApp::applicationWillTerminate() {
     if (_window)
         _window->setHidden(true);
     setWindow(nullptr);
+    _model->setDrive(nullptr);
     _model.reset();
+}
+
+const VelmoraModel& VelmoraApp::model() const {
+    return *_model;
 }
 
 void VelmoraApp::getSaveButtonPref() {
@@ -135,10 +152,16 @@ void VelmoraApp::togglePrivacy() {
     _endsOnceSaved = false;
     closeSaveView();
     _model->forget();
+    _drive->forget();
     clearPanes();
     updateNotice();
     _window->displayIfNeeded(); // the connection may block for seconds
     _platform->model().queue.async([model = _model] { model->restartMonitor(); });
+}
+
+void VelmoraApp::pinFocusRow() {
+    if (_model)
+        static_cast<VelmoraPaneController&>(*_navController->topViewController()).togglePinOfFocusRow();
 }
 
 void VelmoraApp::clearPanes() {
@@ -185,8 +208,10 @@ void VelmoraApp::connectionChanged() {
         logLine(LogPriority::Error, line);
     if (!line.empty() || _model->isConnected())
         _loggedProblem = line;
-    if (!_model->isConnected())
-        _window->displayIfNeeded(); // the next attempt to connect may block for seconds
+    if (_model->isConnected())
+        return;
+    _drive->linkLost();
+    _window->displayIfNeeded(); // the next attempt to connect may block for seconds
 }
 
 void VelmoraApp::updateNotice() {

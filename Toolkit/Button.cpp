@@ -58,6 +58,13 @@ void Button::setEnabled(bool isEnabled) {
 
 void Button::setTogglable(bool isTogglable) {
     _button->setCheckable(isTogglable);
+    // Some palettes have hardly another colour for it.
+    QObject::connect(_button, &QPushButton::toggled, _button, [button = _button](bool isOn) {
+        QFont font = button->font();
+        font.setBold(isOn);
+        font.setUnderline(isOn);
+        button->setFont(font);
+    });
 }
 
 bool Button::isOn() const {

@@ -40,13 +40,17 @@ _velmora() {
         _filedir -d
         return
         ;;
+    --view)
+        _velmora_offer panes drive
+        return
+        ;;
     --mask-key)
         _filedir
         return
         ;;
     esac
     $split && return
-    _velmora_offer -h --help --version --sysroot --log-directory --start-service --mask-key --self-test --log --log-level
+    _velmora_offer -h --help --version --sysroot --log-directory --start-service --mask-key --view --self-test --log --log-level
 }
 
 # Completes a source: its kind, a scenario's name or a file, and then the options after commas.

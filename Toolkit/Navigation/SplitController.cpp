@@ -75,14 +75,16 @@ void SplitController::show(Side& side, bool isShown) {
         return;
     ViewController& controller = *side.controller;
     if (isShown) {
-        view().addSubview(controller.view());
+        if (controller.view().superview() != &view())
+            view().addSubview(controller.view());
+        controller.view().setHidden(false);
         layout();
         controller.viewWillAppear(false);
         if (_hasAppeared)
             controller.viewDidAppear(false);
     } else {
         controller.viewWillDisappear(false);
-        controller.view().removeFromSuperview();
+        controller.view().setHidden(true); // it stays in the window, where it may present other screens
         controller.viewDidDisappear(false);
     }
 }

@@ -89,6 +89,11 @@ void GridWidget::choose(const QModelIndex& index) {
         chosen(static_cast<std::size_t>(index.row()));
 }
 
+void GridWidget::moveTo(int row) {
+    if (row >= 0 && row < _content.rowCount())
+        setCurrentIndex(_content.index(row, std::max(currentIndex().column(), 0)));
+}
+
 void GridWidget::paintEvent(QPaintEvent* event) {
     QTableView::paintEvent(event);
     if (_content.rowCount() > 0 || _placeholder.isEmpty())
@@ -111,6 +116,8 @@ void GridWidget::keyPressEvent(QKeyEvent* event) {
     case Qt::Key_Enter:
     case Qt::Key_Space:
     case Qt::Key_Select: choose(currentIndex()); return;
+    case Qt::Key_Home: moveTo(0); return;
+    case Qt::Key_End: moveTo(_content.rowCount() - 1); return;
     case Qt::Key_Escape: event->ignore(); return;
     default: break;
     }

@@ -34,6 +34,7 @@ protected:
 
 private:
     void choose(const QModelIndex& index);
+    void moveTo(int row);
 
     GridContent _content;
     QString _placeholder;
