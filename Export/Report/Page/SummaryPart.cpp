@@ -69,7 +69,7 @@ void writeShares(Markup& out, const TechnologyReport& technology) {
     if (whole.count() == 0)
         return;
     beginTable(out, "Time by radio technology and level class: " + technology.catalogue().technology(),
-               {"Radio technology", "Level", "#Time", "#Share", ""});
+               {"Radio technology", "Level", "#Time", "#Share", "Bar"});
     for (std::size_t row = 0; row <= TimeShares::noTechnology; ++row)
         for (std::size_t i = 0; i <= TimeShares::noClass; ++i) {
             const std::chrono::nanoseconds time = shares.time(row, i);
