@@ -7,6 +7,7 @@
 #include "Platform/Clock.h"
 #include "Platform/Result.h"
 #include "Recording/Comments.h"
+#include "Recording/Positions/PositionSentence.h"
 
 #include <cstddef>
 #include <cstdint>
@@ -69,6 +70,10 @@ public:
     /// Whether `next` returns the messages of all technologies; the default is those of the first alone, and
     /// the others are losses.
     virtual void setReadsAllTechnologies(bool) {}
+    /// Passes on the sentences of the file's receiver of positions, in calls of `next`, in the file's order
+    /// between the messages; an empty function for none, which is the default. Files of other forms than
+    /// recordings have none.
+    virtual void setSentences(PositionSentences) {}
     /// The file's form, for messages: "recording", "snapshot", "DLF log".
     [[nodiscard]] virtual std::string_view form() const { return "recording"; }
     /// Whether the file is gzip'd; offsets are those in what it unpacks to.

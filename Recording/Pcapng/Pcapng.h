@@ -5,6 +5,7 @@
 
 #include <cstddef>
 #include <cstdint>
+#include <string_view>
 
 /// Constants of the pcapng capture file format, in which recordings are written. Every block is a type, a
 /// total length, a body padded to 32 bits, and the total length again, all in the byte order of its section.
@@ -40,6 +41,9 @@ inline constexpr std::uint16_t TimeOffset = 14;
 inline constexpr std::uint32_t byteOrderMagic = 0x1A2B3C4D;
 /// The first of the link types that are free for private use; an interface of log messages has it.
 inline constexpr std::uint16_t logMessageLinkType = 147;
+/// The second of them: an interface of NMEA 0183 sentences, one a packet, has it and this name.
+inline constexpr std::uint16_t positionLinkType = 148;
+inline constexpr std::string_view positionName = "NMEA";
 
 /// The most bytes of a packet that capture tools read: at a longer one they give up the rest of the file,
 /// whatever the interface's limit is. Blocks of types that they do not know they skip. So a longer message

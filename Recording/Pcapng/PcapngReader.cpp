@@ -146,6 +146,11 @@ void PcapngReader::addInterface(const Block& block) {
         return;
     }
     interface.description = *std::move(description);
+    if (interface.description.linkType == pcapng::positionLinkType &&
+        interface.description.name == pcapng::positionName) {
+        interface.use = Use::Positions;
+        return;
+    }
     if (interface.description.linkType != pcapng::logMessageLinkType) {
         interface.use = Use::OtherLinkType;
         ++_passedOver.interfaces;
@@ -190,6 +195,11 @@ void PcapngReader::readMessage(const Block& block, std::optional<LoggedMessage>&
         passOn(block);
         return;
     }
+    if (interface != nullptr && interface->use == Use::Positions) {
+        readSentence(block, packet, interface->description);
+        passOn(block);
+        return;
+    }
     const bool isOther = interface != nullptr && (interface->use == Use::OtherTechnology ||
                                                   (interface->technology != 0 && !_readsAllTechnologies));
     if (isOther)
@@ -231,6 +241,18 @@ void PcapngReader::readMessage(const Block& block, std::optional<LoggedMessage>&
         made.message = _blocks.part(packet.offset, packet.captured);
         _messageBlock = &block;
     }
+}
+
+void PcapngReader::readSentence(const Block& block, const Packet& packet,
+                                const InterfaceDescription& interface) {
+    const std::size_t room = block.length - 4;
+    if (!_sentences || packet.offset > room || packet.captured > room - packet.offset)
+        return;
+    const std::optional<Time> time = packet.hasStamp ? interface.time(packet.stamp) : _lastTime;
+    const Bytes text = block.bytes.subspan(packet.offset, packet.captured);
+    if (time)
+        _sentences(
+            {*time, std::string_view(reinterpret_cast<const char*>(text.data()), text.size()), _packets});
 }
 
 /// Reads the blocks with the other parts of the packet's message. False if one is missing.

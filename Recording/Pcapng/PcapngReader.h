@@ -27,7 +27,8 @@ namespace velmora {
 /// interfaces, any time resolution, all three kinds of packet blocks; other blocks are skipped. An
 /// interface's name is its technology. The first one named is the recording's; messages of interfaces without
 /// a name belong to it as well, those of another technology are losses unless all technologies are read.
-/// Interfaces of other link types are counted and otherwise ignored.
+/// Packets of interfaces of link type 148 with the name "NMEA" are a receiver's sentences. Interfaces of
+/// other link types are counted and otherwise ignored.
 ///
 /// Where a block is damaged, reading resumes at the next block that is not. Memory is bounded for any
 /// content; a message is a window on the reader's chunk and keeps that alive: copy messages that are kept for
@@ -56,6 +57,7 @@ public:
     [[nodiscard]] const std::string& technology() const override { return _technologies.front(); }
     [[nodiscard]] std::vector<std::string> technologies() const override;
     void setReadsAllTechnologies(bool all) override { _readsAllTechnologies = all; }
+    void setSentences(PositionSentences sentences) override { _sentences = std::move(sentences); }
     [[nodiscard]] const std::optional<Failure>& failure() const override { return _blocks.failure(); }
     [[nodiscard]] const PassedOver& passedOver() const { return _passedOver; }
 
@@ -71,7 +73,7 @@ public:
 
 private:
     struct Interface {
-        enum class Use : std::uint8_t { Messages, OtherTechnology, OtherLinkType, Unreadable };
+        enum class Use : std::uint8_t { Messages, OtherTechnology, Positions, OtherLinkType, Unreadable };
         Use use = Use::Messages;
         std::uint32_t technology = 0; ///< its index; of messages
         InterfaceDescription description;
@@ -97,6 +99,8 @@ private:
     /// Adds the comments among the block's options, which begin at that offset of it.
     void readComments(const Block& block, std::size_t options, Comment::About about, std::uint64_t number);
     void passOn(const Block& block);
+    /// Passes on a packet's sentence, unless it is damaged: that is no lost message.
+    void readSentence(const Block& block, const Packet& packet, const InterfaceDescription& interface);
     /// Reads a packet's message, unless the packet is ignored or a loss.
     void readMessage(const Block& block, std::optional<LoggedMessage>& message);
     [[nodiscard]] bool join(const Block& block, const Packet& packet);
@@ -113,6 +117,7 @@ private:
     std::size_t _headSize = 0;
     bool _isOpening = true;
     std::function<void(const Block&)> _otherBlocks;
+    PositionSentences _sentences;
     std::uint64_t _sectionCount = 0;
     std::uint64_t _interfaceCount = 0;                     ///< in all sections
     std::vector<Interface> _interfaces;                    ///< of the present section
