@@ -3,6 +3,7 @@
 
 #include "Tools/Report/ReportCommand.h"
 
+#include "Export/Tracks/TrackCollector.h"
 #include "Platform/Linux/Files/AtomicFile.h"
 #include "Tools/Analysed/AnalysedFiles.h"
 #include "Tools/ExitStatus.h"
@@ -50,8 +51,12 @@ bool readFiles(const ReportOptions& options, const std::optional<MaskOptions>& m
     input.technology = options.technology;
     input.masking = masking;
     input.cleanUp = std::move(cleanUp);
-    input.endsFile = [&page](std::uint32_t index, const MessageReader& reader) {
+    std::optional<TrackCollector> track;
+    input.opensFile = [&track](std::uint32_t, MessageReader& reader) { track.emplace(reader); };
+    input.endsFile = [&page, &track](std::uint32_t index, const MessageReader& reader) {
         page.endInput(index, reader);
+        page.addTrack(track->takeTrack());
+        track.reset();
     };
     input.fails = [&page](std::uint32_t index, const std::string& reason) { page.fail(index, reason); };
     return analyseFiles(input, feed, lines);
