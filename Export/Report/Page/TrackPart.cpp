@@ -3,7 +3,7 @@
 
 #include "Export/Report/Page/TrackPart.h"
 
-#include "Analysis/Tracks/Geodesy.h"
+#include "Analysis/Tracks/Position.h"
 #include "Export/Report/DriveReport.h"
 #include "Export/Report/Page/Markup.h"
 
@@ -34,7 +34,12 @@ public:
         const double height = _north - byLatitude.first->latitude;
         const double width = (byLongitude.second->longitude - _west) * _narrowing;
         _scale = (size - 2 * margin) / std::max({height, width, 1e-4});
-        _metres = distance_m({middle, _west}, {middle, _west + 0.001}) / (0.001 * _narrowing);
+        Fix from{};
+        from.latitude = middle;
+        from.longitude = _west;
+        Fix to = from;
+        to.longitude += 0.001;
+        _metres = distance_m(from, to) / (0.001 * _narrowing);
     }
 
     [[nodiscard]] double x(const Fix& fix) const {

@@ -56,12 +56,16 @@ def unpacked(series: dict[str, Any]) -> dict[int, Bucket]:
         at += skipped
         indexes += range(at, at + length)
         at += length
-    factor = 10 ** series["decimals"]
-    least = summed(series["minimumSteps"])
+    if "decimals" in series:
+        factor = 10 ** series["decimals"]
+        steps = summed(series["minimumSteps"])
+        least = [low / factor for low in steps]
+        greatest = [(low + spread) / factor for low, spread in zip(steps, series["spread"], strict=True)]
+    else:
+        least, greatest = series["minimum"], series["maximum"]
     least_at = summed(series["minimumAtSteps"])
-    columns = zip(indexes, least, series["spread"], series["count"], least_at, series["maximumAtOffset"], strict=True)
-    return {index: (low / factor, (low + spread) / factor, count, number, number + offset)
-            for index, low, spread, count, number, offset in columns}
+    columns = zip(indexes, least, greatest, series["count"], least_at, series["maximumAtOffset"], strict=True)
+    return {index: (low, high, count, number, number + offset) for index, low, high, count, number, offset in columns}
 
 
 def wanted_buckets(samples: list[dict[str, Any]], path: str, width_ms: int, only_best: bool) -> dict[int, Bucket]:
