@@ -94,7 +94,8 @@ class Chromium(Browser):
 
     def problems(self) -> list[str]:
         for entry in self._call("POST", "/se/log", {"type": "browser"}):
-            self._problems.append(entry["message"])
+            if entry["level"] == "SEVERE":  # others are advice, such as about how these checks read canvases
+                self._problems.append(entry["message"])
         for entry in self._call("POST", "/se/log", {"type": "performance"}):
             message = json.loads(entry["message"])["message"]
             if message["method"] == "Network.requestWillBeSent":

@@ -32,6 +32,13 @@ return Services.console.getMessageArray()
 """
 
 
+PAGE_SIZE = """
+const { style } = Services.wm.getMostRecentWindow("navigator:browser").gBrowser.selectedBrowser;
+for (const [name, size] of [["width", arguments[0]], ["height", arguments[1]]])
+    for (const limit of [name, "min-" + name, "max-" + name]) style.setProperty(limit, size + "px");
+"""
+
+
 class Firefox(Browser):
     name = "firefox"
 
@@ -93,11 +100,10 @@ class Firefox(Browser):
         return self._call("WebDriver:ExecuteScript", {"script": script, "args": list(arguments), "sandbox": None})
 
     def resize(self, width: int, height: int) -> None:
-        # The window's frame has a size of its own, and a narrow window is no narrower than its toolbar.
-        for _ in range(2):
-            inner = self.run("return [outerWidth - innerWidth, outerHeight - innerHeight]")
-            self._call("WebDriver:SetWindowRect", {"width": width + inner[0], "height": height + inner[1]})
-            time.sleep(0.2)
+        # The page alone: a window is no narrower than its toolbar.
+        self._call("WebDriver:SetWindowRect", {"width": 1400, "height": height + 200})
+        self._in_chrome(PAGE_SIZE, width, height)
+        time.sleep(0.3)
 
     def set_dark(self, dark: bool) -> None:
         self._in_chrome("Services.prefs.setIntPref(arguments[0], arguments[1])",

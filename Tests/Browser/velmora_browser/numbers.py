@@ -11,7 +11,6 @@ from pathlib import Path
 from typing import Any
 
 FIGURES = ("samples", "minimum", "p5", "p50", "p95", "maximum", "mean")
-EXACT = 1e-9
 
 
 def objects(program: Path, *arguments: object) -> list[dict[str, Any]]:
@@ -90,9 +89,13 @@ def pattern(path: str) -> str:
     return "/".join("*" if part.isdecimal() else part for part in path.split("/"))
 
 
-def check_series(data: dict[str, Any], samples: list[dict[str, Any]]) -> Iterator[str]:
-    if not data["series"]:
-        yield "there are no series"
+CHARTED = ("serving.level", "serving.quality", "neighbour.level", "neighbour.quality", "block-error-rate", "data-rate")
+
+
+def check_series(data: dict[str, Any], samples: list[dict[str, Any]], stats: dict[str, Any]) -> Iterator[str]:
+    reported = {role["role"] for role in stats["roles"] if role["samples"]} & set(CHARTED)
+    if missing := reported - {series["role"] for series in data["series"]}:
+        yield f"no series of {sorted(missing)}"
     for series in data["series"]:
         got, wanted = unpacked(series), wanted_buckets(samples, series["path"], series["width"], series["best"])
         if got != wanted:
@@ -145,8 +148,9 @@ def check_events(data: dict[str, Any], events: list[dict[str, Any]]) -> Iterator
 def check_numbers(program: Path, recording: Path, data: dict[str, Any]) -> Iterator[str]:
     """For a page of one recording whose numbers are its own."""
     samples = objects(program, "decode", "--samples", "--format", "jsonl", recording)
-    yield from check_series(data, samples)
-    yield from check_roles(data, document(program, "stats", "--format", "json", recording)[0])
+    stats = document(program, "stats", "--format", "json", recording)[0]
+    yield from check_series(data, samples, stats)
+    yield from check_roles(data, stats)
     yield from check_cells(data, document(program, "stats", "--by", "cell", "--format", "json", recording))
     yield from check_events(data, objects(program, "events", "--format", "jsonl", recording))
     info = document(program, "info", "--format", "json", recording)

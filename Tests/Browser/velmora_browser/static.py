@@ -12,7 +12,7 @@ from html.parser import HTMLParser
 from typing import Any
 
 DATA = re.compile(r'<script type="application/json" id="data">(.*?)</script>', re.S)
-VOID = {"meta", "path", "rect", "link"}
+VOID = {"meta"}
 
 
 class Elements(HTMLParser):
