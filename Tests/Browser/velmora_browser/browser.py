@@ -26,6 +26,10 @@ class Browser(ABC):
     def set_dark(self, dark: bool) -> None: ...
 
     @abstractmethod
+    def set_print(self, printed: bool) -> None:
+        """Shows the page as it is on paper."""
+
+    @abstractmethod
     def press(self, keys: str) -> None:
         """Presses keys one after the other, where the focus is."""
 

@@ -132,6 +132,11 @@ def check_accessible(browser: Browser, axe: str | None, where: str) -> Iterator[
 
 
 def check_print(browser: Browser) -> Iterator[str]:
+    browser.set_print(True)
+    charts, pictures = browser.run("return ['live', 'pictures'].map((id) => document.getElementById(id).offsetHeight)")
+    if charts or not pictures:
+        yield f"on paper the charts are {charts} high and the pictures {pictures}"
+    browser.set_print(False)
     if not browser.pdf().startswith(b"%PDF"):
         yield "printing makes no document"
 

@@ -68,6 +68,9 @@ class Chromium(Browser):
         value = "dark" if dark else "light"
         self._developer("Emulation.setEmulatedMedia", media="", features=[{"name": "prefers-color-scheme", "value": value}])
 
+    def set_print(self, printed: bool) -> None:
+        self._developer("Emulation.setEmulatedMedia", media="print" if printed else "")
+
     def _act(self, actions: list[dict[str, Any]]) -> None:
         self._call("POST", "/actions", {"actions": actions})
         time.sleep(0.15)  # a frame, in which the page draws

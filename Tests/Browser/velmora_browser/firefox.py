@@ -32,6 +32,9 @@ return Services.console.getMessageArray()
 """
 
 
+MEDIUM = """
+Services.wm.getMostRecentWindow("navigator:browser").gBrowser.selectedBrowser.browsingContext.mediumOverride = arguments[0];
+"""
 PAGE_SIZE = """
 const { style } = Services.wm.getMostRecentWindow("navigator:browser").gBrowser.selectedBrowser;
 for (const [name, size] of [["width", arguments[0]], ["height", arguments[1]]])
@@ -108,6 +111,10 @@ class Firefox(Browser):
     def set_dark(self, dark: bool) -> None:
         self._in_chrome("Services.prefs.setIntPref(arguments[0], arguments[1])",
                         "layout.css.prefers-color-scheme.content-override", DARK if dark else LIGHT)
+        time.sleep(0.3)
+
+    def set_print(self, printed: bool) -> None:
+        self._in_chrome(MEDIUM, "print" if printed else "")
         time.sleep(0.3)
 
     def _act(self, actions: list[dict[str, Any]]) -> None:
