@@ -43,7 +43,7 @@ TEST(StateBand, JoinsTheShortestStatesOfVeryMany) {
     EXPECT_LE(band.steps().size(), 17U);
     EXPECT_EQ(shown(band).front(), "0 long");
     EXPECT_EQ(shown(band)[1], "100 several");
-    EXPECT_EQ(shown(band)[2], "101 b"); // the last of them lasts
+    EXPECT_EQ(shown(band)[band.steps().size() - 2], "101 b"); // the last of them lasts
     EXPECT_EQ(shown(band).back(), "200 last");
 }
 
