@@ -19,6 +19,7 @@ constexpr FuzzTargetKind kinds[] = {
     {"ifx", makeIFXTarget, [] { return decoderCorpus("ifx"); }, 2048},
     {"same-labels", makeSameLabelsTarget, sameLabelsCorpus, 2048},
     {"observations", makeObservationsTarget, sameLabelsCorpus, 2048},
+    {"report", makeReportTarget, sameLabelsCorpus, 2048},
     {"template", makeTemplateTarget, templateCorpus, 4096},
     {"frame", makeFrameTarget, frameCorpus},
     {"recording", makeRecordingTarget, recordingCorpus, 1536},

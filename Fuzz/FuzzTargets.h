@@ -41,6 +41,7 @@ struct FuzzTargetKind {
 [[nodiscard]] std::unique_ptr<FuzzTarget> makeIFXTarget();
 [[nodiscard]] std::unique_ptr<FuzzTarget> makeSameLabelsTarget();
 [[nodiscard]] std::unique_ptr<FuzzTarget> makeObservationsTarget();
+[[nodiscard]] std::unique_ptr<FuzzTarget> makeReportTarget();
 [[nodiscard]] std::unique_ptr<FuzzTarget> makeTemplateTarget();
 [[nodiscard]] std::unique_ptr<FuzzTarget> makeFrameTarget();
 [[nodiscard]] std::unique_ptr<FuzzTarget> makeRecordingTarget();

@@ -12,7 +12,7 @@ build_packages=(build-essential cmake ninja-build qt6-base-dev libgl-dev libpugi
 test_packages=(libgtest-dev libgmock-dev librapidcheck-dev libbenchmark-dev nlohmann-json3-dev python3 tshark clang-format-14
     fonts-dejavu-core xvfb dbus at-spi2-core gir1.2-atspi-2.0 python3-gi desktop-file-utils appstream
     modemmanager shellcheck reuse git lintian fakeroot file systemd python3-jsonschema mandoc bash-completion
-    mypy)
+    mypy chromium chromium-driver firefox-esr)
 # shellcheck disable=SC2034
 fuzz_packages=(clang libclang-rt-14-dev)
 # shellcheck disable=SC2034
@@ -82,6 +82,22 @@ install_column_readers() {
         cp Tests/Columns/Readers/package-lock.json "$directory/installed"
     else
         say "npm could not install them (see $directory/npm.log): the test that reads columns with them is skipped"
+    fi
+}
+
+# install_page_checkers: what the tests check pages with for accessibility, from npm, into build/page-checkers. Without it
+# the pages are not checked for that, and the test says so.
+install_page_checkers() {
+    local directory=build/page-checkers
+    command -v npm >/dev/null || return 0
+    mkdir -p "$directory"
+    cmp -s Tests/Browser/Checkers/package-lock.json "$directory/installed" && return 0
+    cp Tests/Browser/Checkers/package.json Tests/Browser/Checkers/package-lock.json "$directory"
+    say "Installing what pages are checked with"
+    if npm install --prefix "$directory" --ignore-scripts --no-audit --no-fund >"$directory/npm.log" 2>&1 </dev/null; then
+        cp Tests/Browser/Checkers/package-lock.json "$directory/installed"
+    else
+        say "npm could not install it (see $directory/npm.log): pages are not checked for accessibility"
     fi
 }
 

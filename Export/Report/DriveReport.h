@@ -7,6 +7,7 @@
 #include "Analysis/Statistics/StatisticsGroups.h"
 #include "Export/Report/ReportEvents.h"
 #include "Export/Report/ReportInput.h"
+#include "Export/Report/ReportTrack.h"
 #include "Export/Report/TechnologyReport.h"
 #include "Export/Report/TimeSpans.h"
 
@@ -40,6 +41,8 @@ public:
     void count(MessageNumber message, Time time);
     /// What the reader of that input has met; at its end.
     void endInput(std::uint32_t input, const MessageReader& reader);
+    /// Where the next input's receiver of positions was.
+    void addTrack(const Track& track) { _track.add(track); }
     /// Not all of the input could be read or decoded. The latest reason is shown.
     void fail(std::uint32_t input, std::string reason);
     /// There are no more messages. Call it before `write`.
@@ -64,11 +67,14 @@ public:
     /// input's.
     [[nodiscard]] std::uint64_t numbersBefore(std::uint32_t input) const;
     [[nodiscard]] const TimeSpans& spans() const { return _spans; }
+    /// Empty where there are no positions.
+    [[nodiscard]] const ReportTrack& track() const { return _track; }
 
 private:
     Options _options;
     std::vector<ReportInput> _inputs;
     TimeSpans _spans;
+    ReportTrack _track;
     ReportEvents _events;
     StatisticsGroups _groups;
     std::vector<std::unique_ptr<TechnologyReport>> _technologies;

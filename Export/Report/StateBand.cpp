@@ -38,21 +38,23 @@ void StateBand::rename(std::string_view value, std::string name) {
 
 /// Joins what is shorter than some time, until half of the steps are left.
 void StateBand::coarsen() {
-    constexpr std::chrono::nanoseconds first = std::chrono::milliseconds(250);
-    while (_steps.size() > _most / 2) {
-        if (_shortest > std::chrono::nanoseconds::max() / 4)
-            break;
-        _shortest = _shortest.count() == 0 ? first : _shortest * 2;
-        std::size_t kept = 0;
-        for (std::size_t i = 0; i < _steps.size(); ++i) {
-            Step step = _steps[i];
-            if (i + 1 < _steps.size() && durationBetween(step.since, _steps[i + 1].since) < _shortest)
-                step.value = several;
-            if (kept == 0 || _steps[kept - 1].value != step.value)
-                _steps[kept++] = step;
-        }
-        _steps.resize(kept);
+    joinShort();
+    while (_steps.size() > _most / 2 && _shortest < std::chrono::nanoseconds::max() / 4) {
+        _shortest *= 2;
+        joinShort();
     }
+}
+
+void StateBand::joinShort() {
+    std::size_t kept = 0;
+    for (std::size_t i = 0; i < _steps.size(); ++i) {
+        Step step = _steps[i];
+        if (i + 1 < _steps.size() && durationBetween(step.since, _steps[i + 1].since) < _shortest)
+            step.value = several;
+        if (kept == 0 || _steps[kept - 1].value != step.value)
+            _steps[kept++] = step;
+    }
+    _steps.resize(kept);
 }
 
 } // namespace velmora

@@ -51,13 +51,15 @@ public:
 private:
     [[nodiscard]] std::uint32_t numberOf(std::string_view value);
     void coarsen();
+    void joinShort();
 
     std::string _name;
     std::size_t _most;
     std::vector<std::string> _values{"", "several"};
     std::map<std::string, std::uint32_t, std::less<>> _numbers;
     std::vector<Step> _steps;
-    std::chrono::nanoseconds _shortest{0}; ///< states that are shorter are not shown one by one
+    /// States that are shorter are not shown one by one, once there are too many.
+    std::chrono::nanoseconds _shortest = std::chrono::milliseconds(250);
 };
 
 } // namespace velmora

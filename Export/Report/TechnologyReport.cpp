@@ -44,7 +44,7 @@ std::chrono::nanoseconds TechnologyReport::pass(Time time) {
 void TechnologyReport::report(const MessageReport& report) {
     const std::chrono::nanoseconds passed = pass(report.time);
     if (passed.count() > 0)
-        _shares.add(_engine.picture().technology(), _class, passed);
+        _shares[_isByFile ? report.message.input : 0].add(_engine.picture().technology(), _class, passed);
     _engine.report(report);
     classify();
     _statistics.report(report);

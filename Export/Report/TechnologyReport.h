@@ -50,9 +50,9 @@ public:
     [[nodiscard]] const Catalogue& catalogue() const { return _engine.picture().catalogue(); }
     [[nodiscard]] const CellRows& cells() const { return _cells; }
     [[nodiscard]] const NeighbourRows& neighbours() const { return _neighbours; }
-    [[nodiscard]] const TimeShares& shares() const { return _shares; }
     /// Of the group of that number: the input's where statistics are by file, otherwise 0.
     [[nodiscard]] const LeafExtremes& extremes(std::size_t group) const { return _extremes[group]; }
+    [[nodiscard]] const TimeShares& shares(std::size_t group) const { return _shares[group]; }
     /// Those that have values.
     [[nodiscard]] const std::deque<ChartedLeaf>& series() const { return _series; }
     [[nodiscard]] std::vector<const StateBand*> bands() const;
@@ -77,9 +77,9 @@ private:
     TechnologyStatistics _statistics;
     CellRows _cells;
     NeighbourRows _neighbours;
-    TimeShares _shares;
     bool _isByFile;
     std::array<LeafExtremes, 2> _extremes;
+    std::array<TimeShares, 2> _shares;
     std::vector<Use> _uses; ///< by the leaf's index
     std::deque<ChartedLeaf> _series;
     StateBand _technologyBand{"radio technology"};

@@ -203,6 +203,10 @@ _velmora_log() {
         _velmora_path
         return
         ;;
+    -o | --output)
+        _filedir html
+        return
+        ;;
     --out | --compact)
         _filedir -d
         return
@@ -220,7 +224,7 @@ _velmora_log() {
         if [[ $cur == -* ]]; then
             _velmora_offer "${options[@]}" --version
         else
-            _velmora_offer decode watch record convert info fields events rules stats diff mask columns
+            _velmora_offer decode watch record convert info fields events rules stats diff report mask columns
         fi
         return
         ;;
@@ -234,6 +238,7 @@ _velmora_log() {
         --no-rules --exec --exec-timeout --fail-on --duration --count --timeout) ;;
     stats) options+=(--format --safe --histogram --by --select --role --from --to --clock --technology) ;;
     diff) options+=(--format --display --select --role --clock --technology) ;;
+    report) options+=(-o --output --force --with-identities --rules --no-rules --clock --technology --mask --key) ;;
     mask) options+=(--level --key --technology --keep-unknown --report --force --new-key --check --known) ;;
     columns) options+=(--out --compact --technology --mask --key) ;;
     esac
@@ -245,7 +250,7 @@ _velmora_log() {
     case $command:$files in
     rules:0) _velmora_offer check test ;;
     rules:*) _filedir toml ;;
-    decode:* | info:* | events:* | stats:* | columns:* | record:0 | convert:[01] | diff:[01] | mask:[01])
+    decode:* | info:* | events:* | stats:* | report:* | columns:* | record:0 | convert:[01] | diff:[01] | mask:[01])
         _filedir '@(pcapng|velmora|dlf)'
         ;;
     esac

@@ -48,7 +48,7 @@ function setCursor(place, doesShow) {
         setView(cursor - half, cursor + half);
     }
     requestAnimationFrame(showCursor);
-    for (const call of whenCursorMoves) call(timeAt(cursor));
+    for (const call of whenCursorMoves) call();
 }
 
 // Shows that time, close enough to see what happened.

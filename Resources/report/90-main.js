@@ -37,6 +37,7 @@ readPalette();
 if (spans.length) {
     makeStage();
     makeList();
+    makeTrack();
     document.getElementById("pictures").hidden = true;
     redraw();
 }

@@ -63,6 +63,8 @@ bool analyseFile(std::uint32_t index, const AnalysedInput& input, std::optional<
     MaskedInput masked(
         **reader, path, input.technology,
         masking && !input.technology.empty() ? technologiesOf(path) : std::vector<std::string>(), masking);
+    if (input.opensFile)
+        input.opensFile(index, masked.reader());
     FileMessages messages(masked.reader(), {index, path, input.technology}, feed, context);
     messages.setProgress(progress ? progress->get() : nullptr);
     Result<Done> analysed = messages.run(input.isDone);

@@ -26,6 +26,8 @@ struct AnalysedInput {
     std::function<void()> beforeWaiting = {};                 ///< more is waited for, as of a pipe
     std::function<bool()> whileWaiting = {};                  ///< as FileSource's hook
     std::function<bool()> isDone = {};                        ///< whether the rest need not be read
+    /// A file has been opened, and nothing of it has been read.
+    std::function<void(std::uint32_t input, MessageReader& reader)> opensFile = {};
     /// All of a file has been read that can be; its reader has what was lost, and its comments.
     std::function<void(std::uint32_t input, const MessageReader& reader)> endsFile = {};
     /// Not all of a file could be read or decoded; the reason has been reported.

@@ -3,6 +3,7 @@
 
 #include "Tools/Report/ReportCommand.h"
 
+#include "Export/Tracks/TrackCollector.h"
 #include "Platform/Linux/Files/AtomicFile.h"
 #include "Tools/Analysed/AnalysedFiles.h"
 #include "Tools/ExitStatus.h"
@@ -44,14 +45,17 @@ std::vector<std::string> shownNames(const std::vector<std::string>& files) {
 
 /// Reads the files into the report. Returns whether all of them was read.
 bool readFiles(const ReportOptions& options, const std::optional<MaskOptions>& masking, DriveReport& page,
-               AnalysisFeed& feed, DecoderLines& lines, std::function<void()> cleanUp) {
+               AnalysisFeed& feed, DecoderLines& lines) {
     AnalysedInput input;
     input.files = options.files;
     input.technology = options.technology;
     input.masking = masking;
-    input.cleanUp = std::move(cleanUp);
-    input.endsFile = [&page](std::uint32_t index, const MessageReader& reader) {
+    std::optional<TrackCollector> track;
+    input.opensFile = [&track](std::uint32_t, MessageReader& reader) { track.emplace(reader); };
+    input.endsFile = [&page, &track](std::uint32_t index, const MessageReader& reader) {
         page.endInput(index, reader);
+        page.addTrack(track->takeTrack());
+        track.reset();
     };
     input.fails = [&page](std::uint32_t index, const std::string& reason) { page.fail(index, reason); };
     return analyseFiles(input, feed, lines);
@@ -73,11 +77,18 @@ bool writePage(const DriveReport& page, const ReportOptions& options, AtomicFile
 /// Whether all of the input is on the page now.
 bool makePage(const ReportOptions& options, const RuleSet& rules, const std::optional<MaskOptions>& masking,
               const std::filesystem::path& target, DecoderLines& lines) {
+    // Before the page, so that an allocation that fails never leaves one on the disk.
+    AtomicFile* made = nullptr;
+    const WorkContext context({}, [&made] {
+        if (made)
+            made->discard();
+    });
     Result<AtomicFile> file = AtomicFile::create(target, newFileMode);
     if (!file) {
         report(options.out + ": " + file.reason());
         return false;
     }
+    made = &*file;
     const RemovedWhenInterrupted removed(file->path());
     DriveReport::Options setup;
     setup.files = shownNames(options.files);
@@ -90,7 +101,7 @@ bool makePage(const ReportOptions& options, const RuleSet& rules, const std::opt
         return std::make_unique<ReportAnalysis>(*page, catalogue);
     });
     page.emplace(std::move(setup));
-    const bool good = readFiles(options, masking, *page, feed, lines, [&file] { file->discard(); });
+    const bool good = readFiles(options, masking, *page, feed, lines);
     page->finish();
     return writePage(*page, options, *file) && good;
 }

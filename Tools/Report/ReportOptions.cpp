@@ -29,8 +29,9 @@ CLI::App* addReport(CLI::App& app, ReportOptions& options) {
         ->allow_extra_args(false) // a FILE may follow
         ->multi_option_policy(CLI::MultiOptionPolicy::TakeAll)
         ->type_name("FILE");
-    command->add_flag("!--no-rules", options.usesStandardRules,
-                      "Neither the built-in rules nor those in ~/.config/velmora/rules");
+    command->add_flag_callback(
+        "--no-rules", [&options] { options.usesStandardRules = false; },
+        "Leave out the built-in rules and those in ~/.config/velmora/rules");
     addClock(*command, options.clock);
     addTechnology(*command, options.technology, "Decode as");
     addMaskOption(*command, options.mask);

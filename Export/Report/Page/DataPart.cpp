@@ -9,6 +9,7 @@
 #include "Export/Report/Page/FigureRows.h"
 #include "Export/Report/Page/Markup.h"
 #include "Export/Report/Page/SeriesData.h"
+#include "Export/Report/Page/TrackPart.h"
 #include "Export/Report/TimeSpans.h"
 
 namespace velmora {
@@ -127,7 +128,13 @@ void writeData(Markup& out, const DriveReport& report, const TimeAxis& axis) {
             isFirst = false;
             writeBandData(out, technology->catalogue().technology(), *band, base);
         }
-    out.raw("],\n\"events\":");
+    if (!report.track().isEmpty()) {
+        out.raw("],\n\"track\":");
+        writeTrackData(out, report, base);
+        out.raw(",\n\"events\":");
+    } else {
+        out.raw("],\n\"events\":");
+    }
     writeEventsData(out, report, base);
     out.raw("}\n</script>\n");
 }

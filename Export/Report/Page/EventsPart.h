@@ -8,8 +8,8 @@ namespace velmora {
 class DriveReport;
 class Markup;
 
-/// Events: how many of each kind, and a table of those that matter most. The list beside the charts has all of
-/// them instead.
+/// Events: how many of each kind, and a table of those that matter most. The list beside the charts has all
+/// of them instead.
 void writeEvents(Markup& out, const DriveReport& report);
 
 } // namespace velmora

@@ -10,6 +10,7 @@
 #include "Export/Report/Page/StatisticsPart.h"
 #include "Export/Report/Page/SummaryPart.h"
 #include "Export/Report/Page/TablesPart.h"
+#include "Export/Report/Page/TrackPart.h"
 
 #include <nettle/base64.h>
 #include <nettle/sha2.h>
@@ -52,12 +53,16 @@ void PageWriter::write() {
         _out.raw(&input == &_report.inputs().front() ? "" : ", ").text(input.name);
     _out.raw("</h1>\n<nav aria-label=\"Parts of this page\"><ul>"
              "<li><a href=\"#summary\">Summary</a></li><li><a href=\"#charts\">Charts</a></li>"
-             "<li><a href=\"#events\">Events</a></li><li><a href=\"#cells\">Cells</a></li>"
+             "");
+    if (!_report.track().isEmpty())
+        _out.raw("<li><a href=\"#track\">Track</a></li>");
+    _out.raw("<li><a href=\"#events\">Events</a></li><li><a href=\"#cells\">Cells</a></li>"
              "<li><a href=\"#neighbours\">Neighbours</a></li><li><a href=\"#contexts\">Contexts</a></li>"
              "<li><a href=\"#statistics\">Statistics</a></li></ul></nav>\n"
              "<div id=\"tools\"></div></header>\n<main>\n");
     writeSummary(_out, _report);
     writePictures(_out, _report, axis);
+    writeTrack(_out, _report);
     writeEvents(_out, _report);
     writeTables(_out, _report);
     writeStatistics(_out, _report);

@@ -6,6 +6,7 @@
 #include "Export/Report/DriveReport.h"
 #include "Export/Report/Page/Markup.h"
 #include "Export/Report/Page/Rows.h"
+#include "Export/Report/Page/TrackPart.h"
 
 #include <algorithm>
 #include <array>
@@ -49,6 +50,11 @@ void writeTechnologies(Markup& out, const DriveReport& report) {
     if (isFirst)
         out.raw("nothing: there is no message that could be decoded");
     out.raw(".");
+    if (!report.track().isEmpty()) {
+        out.raw(" Distance: ");
+        writeDistance(out, report.track().length_m());
+        out.raw(".");
+    }
     out.raw(report.options().hasIdentities
                 ? " This page has the identities of subscriber and phone, and their addresses.</p>\n"
                 : " The identities of subscriber and phone, and their addresses, are left out.</p>\n");
@@ -63,13 +69,13 @@ void writeBar(Markup& out, std::chrono::nanoseconds part, std::chrono::nanosecon
     out.raw(name).raw("\" width=\"").point(share * 120).raw("\" height=\"12\"/></svg></td>");
 }
 
-void writeShares(Markup& out, const TechnologyReport& technology) {
-    const TimeShares& shares = technology.shares();
+void writeShares(Markup& out, const TechnologyReport& technology, std::size_t group, const std::string& of) {
+    const TimeShares& shares = technology.shares(group);
     const std::chrono::nanoseconds whole = shares.total();
     if (whole.count() == 0)
         return;
-    beginTable(out, "Time by radio technology and level class: " + technology.catalogue().technology(),
-               {"Radio technology", "Level", "#Time", "#Share", ""});
+    beginTable(out, "Time by radio technology and level class: " + of,
+               {"Radio technology", "Level", "#Time", "#Share", "Bar"});
     for (std::size_t row = 0; row <= TimeShares::noTechnology; ++row)
         for (std::size_t i = 0; i <= TimeShares::noClass; ++i) {
             const std::chrono::nanoseconds time = shares.time(row, i);
@@ -171,7 +177,9 @@ void writeSummary(Markup& out, const DriveReport& report) {
     writeInputs(out, report);
     out.raw("<h3>Was it good?</h3>\n<div class=\"side\">");
     for (const auto& each : report.technologies())
-        writeShares(out, *each);
+        for (std::size_t i = 0; i < (report.isComparison() ? 2 : 1); ++i)
+            writeShares(out, *each, i,
+                        report.isComparison() ? report.inputs()[i].name : each->catalogue().technology());
     writeSeverities(out, report);
     writeWorstMinutes(out, report);
     out.raw("</div>\n");

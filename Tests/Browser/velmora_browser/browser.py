@@ -1,0 +1,80 @@
+# SPDX-FileCopyrightText: 2026 Velmora contributors
+# SPDX-License-Identifier: MIT
+"""What the checks ask of a browser."""
+
+from abc import ABC, abstractmethod
+from pathlib import Path
+from typing import Any
+
+
+class Browser(ABC):
+    """One window. Sizes are in CSS pixels."""
+
+    name: str
+
+    @abstractmethod
+    def open(self, page: Path) -> None: ...
+
+    @abstractmethod
+    def run(self, script: str, *arguments: Any) -> Any:
+        """Runs the body of a function in the page and returns its result; waits for promises."""
+
+    @abstractmethod
+    def resize(self, width: int, height: int) -> None: ...
+
+    @abstractmethod
+    def set_dark(self, dark: bool) -> None: ...
+
+    @abstractmethod
+    def set_print(self, printed: bool) -> None:
+        """Shows the page as it is on paper."""
+
+    @abstractmethod
+    def press(self, keys: str) -> None:
+        """Presses keys one after the other, where the focus is."""
+
+    @abstractmethod
+    def drag(self, begin: tuple[int, int], end: tuple[int, int], keys: str = "") -> None: ...
+
+    @abstractmethod
+    def move(self, point: tuple[int, int]) -> None: ...
+
+    @abstractmethod
+    def click(self, selector: str) -> None: ...
+
+    @abstractmethod
+    def screenshot(self) -> bytes: ...
+
+    @abstractmethod
+    def pdf(self) -> bytes: ...
+
+    @abstractmethod
+    def problems(self) -> list[str]:
+        """Errors of the console, violations of the security policy, and requests beside the page, so far."""
+
+    @abstractmethod
+    def close(self) -> None: ...
+
+
+def pointer_actions(begin: tuple[int, int], end: tuple[int, int] | None, keys: str) -> list[dict[str, Any]]:
+    """WebDriver's actions: to move to a point and, with an end, to drag from there while keys are held."""
+    def pause() -> dict[str, Any]:
+        return {"type": "pause", "duration": 30}
+
+    move = [{"type": "pointerMove", "x": begin[0], "y": begin[1], "duration": 30}]
+    if end is None:
+        return [{"type": "pointer", "id": "mouse", "actions": move}]
+    middle = ((begin[0] + end[0]) // 2, (begin[1] + end[1]) // 2)
+    path = [*move, {"type": "pointerDown", "button": 0}]
+    path += [{"type": "pointerMove", "x": x, "y": y, "duration": 60} for x, y in (middle, end)]
+    path += [pause(), {"type": "pointerUp", "button": 0}]
+    held = [{"type": "keyDown", "value": key} for key in keys]
+    released = [{"type": "keyUp", "value": key} for key in keys]
+    pauses = [pause() for _ in range(len(path) - len(held))]
+    return [{"type": "key", "id": "keyboard", "actions": [*held, *pauses, pause(), *released]},
+            {"type": "pointer", "id": "mouse", "actions": path}]
+
+
+def key_actions(keys: str) -> list[dict[str, Any]]:
+    return [{"type": "key", "id": "keyboard",
+             "actions": [{"type": kind, "value": key} for key in keys for kind in ("keyDown", "keyUp")]}]

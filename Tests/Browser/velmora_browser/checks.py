@@ -1,0 +1,170 @@
+# SPDX-FileCopyrightText: 2026 Velmora contributors
+# SPDX-License-Identifier: MIT
+"""What holds for a page in a browser. Each check returns what is wrong, in words."""
+
+import time
+from collections.abc import Callable, Iterator
+from pathlib import Path
+
+from .browser import Browser
+
+SHIFT = "\ue008"
+ARROW_RIGHT, HOME, TAB = "\ue014", "\ue011", "\ue004"
+WIDE, NARROW = (1280, 1000), (360, 740)
+
+READY = "return document.documentElement.dataset.ready"
+STAGE = "const box = document.getElementById('stage').getBoundingClientRect();"
+RANGE = "return document.querySelector('.range').textContent"
+CURSOR = "return document.getElementById('cursor-time').textContent"
+COLOURS = """return [...document.querySelectorAll('#stage canvas')].map((canvas) => {
+    const pixels = new Uint32Array(canvas.getContext('2d').getImageData(0, 0, canvas.width, canvas.height).data.buffer);
+    return new Set(pixels).size; });"""
+GROUND = "return getComputedStyle(document.body).backgroundColor"
+VIOLATIONS = """
+return axe.run(document, { resultTypes: ['violations'] }).then((result) => result.violations.map((each) =>
+    each.id + ': ' + each.help + ': ' + each.nodes.slice(0, 2).map((node) => node.html.slice(0, 120)).join(' | ')));
+"""
+
+
+def frame() -> None:
+    time.sleep(0.2)
+
+
+def check_start(browser: Browser, page: Path, slowest_ms: int) -> Iterator[str]:
+    browser.resize(*WIDE)
+    browser.set_dark(False)
+    browser.open(page)
+    frame()
+    ready = browser.run(READY)
+    if ready is None:
+        yield "its script did not get to its end"
+    elif int(ready) > slowest_ms:
+        yield f"interactive after {ready} ms, wanted at most {slowest_ms}"
+    if not browser.run("return document.getElementById('pictures').hidden"):
+        yield "the pictures are shown beside the charts"
+
+
+def check_drawn(browser: Browser) -> Iterator[str]:
+    colours = browser.run(COLOURS)
+    # A chart or band without values has its ground alone.
+    if not colours or max(colours) < 8:
+        yield f"charts are not drawn: their canvases have {colours} colours"
+
+
+def centre(browser: Browser) -> tuple[int, int]:
+    browser.run("document.getElementById('stage').scrollIntoView({ block: 'start' })")
+    x, y = browser.run(STAGE + "return [box.left + box.width / 2, box.top + Math.min(box.height, 300) / 2]")
+    return int(x), int(y)
+
+
+def check_changes(browser: Browser, what: str, script: str, action: Callable[[], object]) -> Iterator[str]:
+    before = browser.run(script)
+    action()
+    frame()
+    if browser.run(script) == before:
+        yield f"{what} changes nothing: {before}"
+
+
+def check_mouse(browser: Browser) -> Iterator[str]:
+    x, y = centre(browser)
+    yield from check_changes(browser, "the mouse", CURSOR, lambda: browser.move((x, y)))
+    yield from check_changes(browser, "dragging with Shift", RANGE, lambda: browser.drag((x - 100, y), (x + 100, y), SHIFT))
+    yield from check_changes(browser, "dragging", RANGE, lambda: browser.drag((x, y), (x + 150, y)))
+    yield from check_changes(browser, "the button to show all", RANGE, lambda: browser.click("button[title='Show all']"))
+
+
+def check_keys(browser: Browser) -> Iterator[str]:
+    browser.run("document.getElementById('stage').focus()")
+    for what, script, keys in (("+", RANGE, "+"), ("the arrow key", CURSOR, ARROW_RIGHT * 3), ("N", CURSOR, "n"), ("P", CURSOR, "p"),
+                               ("Home", CURSOR, HOME), ("0", RANGE, "0")):
+        yield from check_changes(browser, what, script, lambda keys=keys: browser.press(keys))  # type: ignore[misc]
+    yield from check_changes(browser, "Tab", "return document.activeElement.className", lambda: browser.press(TAB))
+
+
+def check_events(browser: Browser) -> Iterator[str]:
+    count = browser.run("return document.querySelectorAll('.event').length")
+    if not count:
+        yield "no events are listed"
+        return
+    browser.run("document.querySelectorAll('.event')[2].click()")
+    frame()
+    chosen, when = browser.run("const row = document.querySelector('.event[aria-selected=true]');"
+                               "return [row !== null, row && row.querySelector('.when').textContent.slice(0, 12)]")
+    if not chosen:
+        yield "no event is chosen by a click"
+    elif when not in browser.run(CURSOR):
+        yield f"the event of {when} has moved the cursor to {browser.run(CURSOR)}"
+
+
+def check_touch(browser: Browser) -> Iterator[str]:
+    if "pan-y" not in browser.run("return getComputedStyle(document.getElementById('stage')).touchAction"):
+        yield "fingers do not reach the charts"
+
+
+def check_zone(browser: Browser) -> Iterator[str]:
+    script = "return document.querySelector('time').textContent"
+    yield from check_changes(browser, "the choice of the zone", script,
+                             lambda: browser.run("document.querySelectorAll('#tools input')[1].click()"))
+    browser.run("document.querySelectorAll('#tools input')[0].click()")
+
+
+def check_width(browser: Browser, size: tuple[int, int]) -> Iterator[str]:
+    browser.resize(*size)
+    frame()
+    inner, scroll = browser.run("return [innerWidth, document.documentElement.scrollWidth]")
+    if inner != size[0]:
+        yield f"the window is {inner} wide, wanted {size[0]}"
+    if scroll > inner:
+        yield f"at {inner} the page is {scroll} wide"
+
+
+def check_dark(browser: Browser) -> Iterator[str]:
+    yield from check_changes(browser, "dark", GROUND, lambda: browser.set_dark(True))
+    pixel = browser.run("return [...document.querySelector('#stage canvas').getContext('2d').getImageData(2, 2, 1, 1).data]")
+    if max(pixel[:3]) > 100:
+        yield f"the charts stay light in the dark: {pixel}"
+
+
+def check_accessible(browser: Browser, axe: str | None, where: str) -> Iterator[str]:
+    if axe is not None:
+        for violation in browser.run(axe + VIOLATIONS):
+            yield f"{where}: {violation}"
+
+
+def check_print(browser: Browser) -> Iterator[str]:
+    browser.set_print(True)
+    charts, pictures = browser.run("return ['live', 'pictures'].map((id) => document.getElementById(id).offsetHeight)")
+    if charts or not pictures:
+        yield f"on paper the charts are {charts} high and the pictures {pictures}"
+    browser.set_print(False)
+    if not browser.pdf().startswith(b"%PDF"):
+        yield "printing makes no document"
+
+
+def check_page(browser: Browser, page: Path, axe: str | None, slowest_ms: int) -> Iterator[str]:
+    """Everything, of a page that has charts and events."""
+    yield from check_start(browser, page, slowest_ms)
+    for check in (check_drawn, check_mouse, check_keys, check_events, check_touch, check_zone):
+        yield from check(browser)
+    yield from check_accessible(browser, axe, "light")
+    yield from check_dark(browser)
+    yield from check_width(browser, NARROW)
+    yield from check_accessible(browser, axe, "dark and narrow")
+    yield from check_print(browser)
+    yield from browser.problems()
+
+
+def check_hostile(browser: Browser, page: Path, names: list[str]) -> Iterator[str]:
+    """A page whose texts try to be more than texts."""
+    yield from check_start(browser, page, 60_000)
+    yield from check_drawn(browser)
+    if (hacked := browser.run("return window.hacked")) is not None:
+        yield f"a text of the recording was run: {hacked}"
+    if (foreign := browser.run("return document.querySelectorAll('img, iframe, object, svg[onload]').length")) != 0:
+        yield f"texts of the recording became {foreign} elements"
+    text = browser.run("return document.documentElement.textContent")
+    yield from (f"the page does not show {name}" for name in names if name not in text)
+    for character in "\u202e\u2066\u200f\u2028\ufeff\0\x1b":
+        if character in text:
+            yield f"the page has the character U+{ord(character):04X}"
+    yield from browser.problems()
