@@ -24,6 +24,7 @@ namespace velmora {
 [[nodiscard]] FuzzCorpus dlfCorpus();
 [[nodiscard]] FuzzCorpus snapshotCorpus();
 [[nodiscard]] FuzzCorpus gzipCorpus();
+[[nodiscard]] FuzzCorpus positionCorpus();
 [[nodiscard]] FuzzCorpus sourceStringCorpus();
 [[nodiscard]] FuzzCorpus ruleExpressionCorpus();
 [[nodiscard]] FuzzCorpus ruleFileCorpus();

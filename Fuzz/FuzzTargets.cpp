@@ -26,6 +26,7 @@ constexpr FuzzTargetKind kinds[] = {
     {"dlf", makeDLFTarget, dlfCorpus},
     {"snapshot", makeSnapshotTarget, snapshotCorpus, 6144},
     {"gzip", makeGzipTarget, gzipCorpus, 512},
+    {"position", makePositionTarget, positionCorpus, 1024},
     {"mask", makeMaskTarget, recordingCorpus, 2048},
     {"source-string", makeSourceStringTarget, sourceStringCorpus, 128},
     {"rule-expression", makeRuleExpressionTarget, ruleExpressionCorpus, 512},

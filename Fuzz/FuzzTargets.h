@@ -48,6 +48,7 @@ struct FuzzTargetKind {
 [[nodiscard]] std::unique_ptr<FuzzTarget> makeDLFTarget();
 [[nodiscard]] std::unique_ptr<FuzzTarget> makeSnapshotTarget();
 [[nodiscard]] std::unique_ptr<FuzzTarget> makeGzipTarget();
+[[nodiscard]] std::unique_ptr<FuzzTarget> makePositionTarget();
 [[nodiscard]] std::unique_ptr<FuzzTarget> makeMaskTarget();
 [[nodiscard]] std::unique_ptr<FuzzTarget> makeSourceStringTarget();
 [[nodiscard]] std::unique_ptr<FuzzTarget> makeRuleExpressionTarget();

@@ -3,6 +3,7 @@
 
 #include "Export/Masking/MaskedRecording.h"
 
+#include "Recording/Pcapng/Pcapng.h"
 #include "Recording/Pcapng/PcapngBlocks.h"
 
 #include <algorithm>
@@ -36,6 +37,19 @@ Result<Done> MaskedRecording::add(Time time, Bytes message, std::string_view tec
     _digest.add(technology, message);
     pcapngBlocks::appendPacket(_buffer, time, message, interfaceOf(technology));
     return _buffer.size() < flushThreshold ? Result<Done>(Done{}) : flush();
+}
+
+void MaskedRecording::addSentence(Time time, std::string_view sentence) {
+    if (_interfaces.empty())
+        return;
+    const auto found = std::ranges::find(_interfaces, pcapng::positionName);
+    const auto index = static_cast<std::uint32_t>(found - _interfaces.begin());
+    if (found == _interfaces.end()) {
+        pcapngBlocks::appendPositionInterface(_buffer);
+        _interfaces.emplace_back(pcapng::positionName);
+    }
+    pcapngBlocks::appendPacket(
+        _buffer, time, Bytes(reinterpret_cast<const std::uint8_t*>(sentence.data()), sentence.size()), index);
 }
 
 Result<Done> MaskedRecording::finish(std::string_view technology) {

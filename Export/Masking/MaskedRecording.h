@@ -27,6 +27,8 @@ public:
 
     /// `technology`: a short name. Precondition: the message is not above `maximumMessageSize`.
     Result<Done> add(Time time, Bytes message, std::string_view technology);
+    /// Adds a sentence of the receiver of positions; nothing before the first message.
+    void addSentence(Time time, std::string_view sentence);
     /// Writes what is left. `technology`: of the interface where there was no message.
     Result<Done> finish(std::string_view technology);
 

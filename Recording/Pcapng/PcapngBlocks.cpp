@@ -57,6 +57,7 @@ std::uint32_t u32At(Bytes blocks, std::size_t offset) {
 }
 
 constexpr std::size_t lengthOffset = 4;
+constexpr std::size_t interfaceOffset = 8;
 constexpr std::size_t originalOffset = 24;
 
 /// The length of the first block, and of those with the rest of its message.
@@ -74,6 +75,20 @@ void appendPart(Buffer& buffer, std::size_t offset, Bytes part) {
     put32(buffer, static_cast<std::uint32_t>(offset));
     putPadded(buffer, part);
     put32(buffer, length);
+}
+
+void appendDescription(Buffer& buffer, std::uint16_t linkType, std::string_view name) {
+    const auto interfaceLength =
+        static_cast<std::uint32_t>(16 + optionSize(name.size()) + optionSize(1) + optionSize(0) + 4);
+    put32(buffer, BlockType::InterfaceDescription);
+    put32(buffer, interfaceLength);
+    put16(buffer, linkType);
+    put16(buffer, 0);
+    put32(buffer, 0); // packets of any length
+    putOption(buffer, Option::InterfaceName, name);
+    putOption(buffer, Option::TimeResolution, Bytes(&nanosecondResolution, 1));
+    putOption(buffer, Option::End, std::string_view());
+    put32(buffer, interfaceLength);
 }
 
 } // namespace
@@ -97,17 +112,11 @@ void appendSection(Buffer& buffer, std::string_view comment) {
 }
 
 void appendInterface(Buffer& buffer, std::string_view technology) {
-    const auto interfaceLength =
-        static_cast<std::uint32_t>(16 + optionSize(technology.size()) + optionSize(1) + optionSize(0) + 4);
-    put32(buffer, BlockType::InterfaceDescription);
-    put32(buffer, interfaceLength);
-    put16(buffer, pcapng::logMessageLinkType);
-    put16(buffer, 0);
-    put32(buffer, 0); // messages of any length
-    putOption(buffer, Option::InterfaceName, technology);
-    putOption(buffer, Option::TimeResolution, Bytes(&nanosecondResolution, 1));
-    putOption(buffer, Option::End, std::string_view());
-    put32(buffer, interfaceLength);
+    appendDescription(buffer, pcapng::logMessageLinkType, technology);
+}
+
+void appendPositionInterface(Buffer& buffer) {
+    appendDescription(buffer, pcapng::positionLinkType, pcapng::positionName);
 }
 
 void appendPacket(Buffer& buffer, Time time, Bytes message, std::uint32_t interface) {
@@ -160,7 +169,7 @@ std::size_t completeBlocks(Bytes blocks, std::size_t length) {
 PacketCount countPackets(Bytes blocks) {
     PacketCount count;
     for (; !blocks.empty(); blocks = blocks.subspan(firstLength(blocks))) {
-        if (u32At(blocks, 0) != BlockType::EnhancedPacket)
+        if (u32At(blocks, 0) != BlockType::EnhancedPacket || u32At(blocks, interfaceOffset) != 0)
             continue;
         ++count.messages;
         count.bytes += u32At(blocks, originalOffset);

@@ -21,6 +21,8 @@ void appendSection(std::vector<std::uint8_t>& buffer, std::string_view comment =
 
 /// Adds the interface description. Precondition: `technology` has at most 65535 bytes.
 void appendInterface(std::vector<std::uint8_t>& buffer, std::string_view technology);
+/// Adds that of an interface of NMEA sentences.
+void appendPositionInterface(std::vector<std::uint8_t>& buffer);
 
 /// Adds a message's block, and those of its further parts where it is long (see pcapng::longestPart). A time
 /// before 1970 cannot be written and becomes 1970-01-01. Precondition: the message is not above
@@ -43,7 +45,7 @@ struct PacketCount {
     std::uint64_t bytes = 0; ///< of the messages themselves
 };
 
-/// What such blocks hold.
+/// What such blocks hold on the first interface.
 [[nodiscard]] PacketCount countPackets(Bytes blocks);
 
 } // namespace velmora::pcapngBlocks

@@ -101,4 +101,20 @@ Buffer readablePacket(const BlockReader::Block& block) {
     return copy;
 }
 
+void shiftInterface(Buffer& block, std::uint32_t from) {
+    namespace BlockType = pcapng::BlockType;
+    constexpr std::size_t interfaceOffset = pcapng::bodyOffset;
+    ByteReader fields(block, false);
+    const std::uint32_t type = fields.u32(0);
+    const bool isShort = type == BlockType::Packet;
+    const std::uint32_t interface = isShort ? fields.u16(interfaceOffset) : fields.u32(interfaceOffset);
+    const bool hasInterface =
+        isShort || type == BlockType::EnhancedPacket || type == BlockType::InterfaceStatistics;
+    if (!fields.isGood() || !hasInterface || interface < from)
+        return;
+    Buffer number;
+    put(number, interface + 1, isShort ? 2 : 4, false);
+    std::copy(number.begin(), number.end(), block.begin() + interfaceOffset);
+}
+
 } // namespace velmora::pcapngCopy

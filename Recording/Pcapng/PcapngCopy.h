@@ -27,4 +27,8 @@ namespace velmora::pcapngCopy {
 /// (see pcapng::longestPart). All others stay as they are.
 [[nodiscard]] std::vector<std::uint8_t> readablePacket(const BlockReader::Block& block);
 
+/// Makes room for an interface of that number: higher and equal numbers in a little-endian packet or block of
+/// statistics grow by one.
+void shiftInterface(std::vector<std::uint8_t>& block, std::uint32_t from);
+
 } // namespace velmora::pcapngCopy

@@ -6,6 +6,7 @@
 #include "Platform/TelephonyService.h"
 #include "Recording/Files/DescriptorFile.h"
 #include "Recording/MessageReader.h"
+#include "Recording/Positions/NMEAWriter.h"
 
 #include <algorithm>
 #include <cerrno>
@@ -31,22 +32,23 @@ bool isTemporary(int error) {
 } // namespace
 
 Result<std::unique_ptr<PcapngWriter>> PcapngWriter::create(const std::string& path,
-                                                           std::string_view technology) {
+                                                           std::string_view technology, Positions positions) {
     if (path == "-")
-        return start(std::make_unique<DescriptorFile>(STDOUT_FILENO, false), "standard output", technology);
+        return start(std::make_unique<DescriptorFile>(STDOUT_FILENO, false), "standard output", technology,
+                     positions);
     const int descriptor = ::open(path.c_str(), O_WRONLY | O_CREAT | O_TRUNC | O_CLOEXEC, S_IRUSR | S_IWUSR);
     if (descriptor < 0)
         return Failure{"cannot create " + path + ": " + std::generic_category().message(errno)};
-    return adopt(descriptor, path, technology);
+    return adopt(descriptor, path, technology, positions);
 }
 
 Result<std::unique_ptr<PcapngWriter>> PcapngWriter::adopt(int descriptor, std::string name,
-                                                          std::string_view technology) {
-    return start(std::make_unique<DescriptorFile>(descriptor, true), std::move(name), technology);
+                                                          std::string_view technology, Positions positions) {
+    return start(std::make_unique<DescriptorFile>(descriptor, true), std::move(name), technology, positions);
 }
 
 Result<std::unique_ptr<PcapngWriter>> PcapngWriter::start(std::unique_ptr<OutputFile> file, std::string name,
-                                                          std::string_view technology) {
+                                                          std::string_view technology, Positions positions) {
     std::unique_ptr<PcapngWriter> writer(new PcapngWriter(std::move(file), std::move(name)));
     const std::string_view shortName = shortTechnologyName(technology);
     if (shortName.size() > maximumTechnology)
@@ -54,6 +56,8 @@ Result<std::unique_ptr<PcapngWriter>> PcapngWriter::start(std::unique_ptr<Output
                        std::to_string(maximumTechnology)};
     pcapngBlocks::appendSection(writer->_head);
     pcapngBlocks::appendInterface(writer->_head, shortName);
+    if (positions == Positions::With)
+        pcapngBlocks::appendPositionInterface(writer->_head);
     writer->_buffer = writer->_head;
     writer->_buffer.reserve(2 * flushThreshold);
     if (const Result<Done> written = writer->flush(); !written && !writer->hasTemporaryError())
@@ -75,20 +79,38 @@ Result<Done> PcapngWriter::append(Time time, Bytes message) {
     if (message.size() > maximumMessageSize)
         return Failure{"message of " + std::to_string(message.size()) + " bytes, wanted at most " +
                        std::to_string(maximumMessageSize)};
-    const std::size_t length = pcapngBlocks::packetSize(message.size());
-    // What has been gathered goes out ahead of a long message, so that the buffer need not hold both.
-    if (!_temporaryError && !waiting().empty() && waiting().size() + length > 2 * flushThreshold) {
-        if (Result<Done> written = flush(); !written && !_temporaryError)
-            return written;
-    }
-    _dropping = _dropping || (_temporaryError && waiting().size() + length > maximumQueue);
-    if (_dropping) {
-        ++_dropped;
-        return *_temporaryError;
+    if (!makeRoom(pcapngBlocks::packetSize(message.size()))) {
+        _dropped += _dropping ? 1 : 0;
+        return outcome();
     }
     pcapngBlocks::appendPacket(_buffer, time, message);
     ++_messages;
     return _temporaryError || waiting().size() < flushThreshold ? outcome() : flush();
+}
+
+Result<Done> PcapngWriter::appendSentence(Time time, std::string_view sentence) {
+    const Bytes text(reinterpret_cast<const std::uint8_t*>(sentence.data()), sentence.size());
+    if (_permanentError || !makeRoom(pcapngBlocks::packetSize(text.size())))
+        return outcome();
+    pcapngBlocks::appendPacket(_buffer, time, text, 1);
+    return _temporaryError || waiting().size() < flushThreshold ? outcome() : flush();
+}
+
+Result<Done> PcapngWriter::appendFix(const Fix& fix) {
+    for (const std::string& sentence : nmeaSentences(fix))
+        if (Result<Done> appended = appendSentence(fix.time, sentence); !appended)
+            return appended;
+    return outcome();
+}
+
+bool PcapngWriter::makeRoom(std::size_t length) {
+    // What has been gathered goes out ahead of a long message, so that the buffer need not hold both.
+    if (!_temporaryError && !waiting().empty() && waiting().size() + length > 2 * flushThreshold) {
+        if (const Result<Done> written = flush(); !written && !_temporaryError)
+            return false;
+    }
+    _dropping = _dropping || (_temporaryError && waiting().size() + length > maximumQueue);
+    return !_dropping;
 }
 
 Result<Done> PcapngWriter::flush() {

@@ -5,6 +5,7 @@
 
 #include "Platform/Bytes.h"
 #include "Platform/Clock.h"
+#include "Platform/Fix.h"
 #include "Platform/Result.h"
 #include "Recording/Files/OutputFile.h"
 #include "Recording/Pcapng/PcapngBlocks.h"
@@ -41,16 +42,22 @@ public:
     /// How much of what is written but not yet synced is kept, to be written again when the sync fails.
     static constexpr std::size_t maximumUnsynced = std::size_t{8} << 20;
 
+    /// Whether the recording has an interface of positions, after that of the messages.
+    enum class Positions : std::uint8_t { Without, With };
+
     /// Creates the file, or empties it; "-" is standard output, which stays open afterwards. The file's head
     /// is written at once. `technology` is a technology's constant or short name, of at most 255 bytes. If
     /// writing the head fails temporarily, a writer is returned that is waiting.
-    static Result<std::unique_ptr<PcapngWriter>> create(const std::string& path, std::string_view technology);
+    static Result<std::unique_ptr<PcapngWriter>> create(const std::string& path, std::string_view technology,
+                                                        Positions positions = Positions::Without);
     /// Writes to an open descriptor, which it takes over; failures name it `name`.
     static Result<std::unique_ptr<PcapngWriter>> adopt(int descriptor, std::string name,
-                                                       std::string_view technology);
+                                                       std::string_view technology,
+                                                       Positions positions = Positions::Without);
     /// Writes to any file of which nothing has been written.
     static Result<std::unique_ptr<PcapngWriter>> start(std::unique_ptr<OutputFile> file, std::string name,
-                                                       std::string_view technology);
+                                                       std::string_view technology,
+                                                       Positions positions = Positions::Without);
 
     ~PcapngWriter();
     PcapngWriter(const PcapngWriter&) = delete;
@@ -59,6 +66,11 @@ public:
     /// Adds a message as it arrived. A time before 1970 cannot be recorded and becomes 1970-01-01. A message
     /// above 16 MiB is refused, which does not end the recording. Precondition: it has not been closed.
     Result<Done> append(Time time, Bytes message);
+    /// Adds an NMEA sentence as it arrived. It does not count as a message, and where messages are dropped it
+    /// is dropped, too. Precondition: the recording has positions and has not been closed.
+    Result<Done> appendSentence(Time time, std::string_view sentence);
+    /// Adds a fix as sentences that arrived at its time.
+    Result<Done> appendFix(const Fix& fix);
     /// Writes all messages so far to the file.
     Result<Done> flush();
     /// Flushes, and starts to sync the file in the background: a later call returns the result.
@@ -90,6 +102,8 @@ private:
 
     [[nodiscard]] std::size_t written() const { return static_cast<std::size_t>(_end - _base); }
     [[nodiscard]] Bytes waiting() const { return Bytes(_buffer).subspan(written()); }
+    /// Makes room for blocks of that length. Whether they may be added now.
+    [[nodiscard]] bool makeRoom(std::size_t length);
     /// What every call returns: the failure, or success if there is none.
     [[nodiscard]] Result<Done> outcome() const;
     /// Takes the result of the sync in the background, if it has ended. False if it failed.

@@ -8,6 +8,7 @@
 #include "Recording/Pcapng/Pcapng.h"
 #include "Recording/Pcapng/PcapngBlocks.h"
 #include "Recording/Pcapng/PcapngCopy.h"
+#include "Recording/Positions/NMEAWriter.h"
 
 #include <system_error>
 #include <utility>
@@ -27,7 +28,24 @@ RecordingCopy::RecordingCopy(PcapngReader& reader, std::unique_ptr<OutputFile> f
 }
 
 Result<Done> RecordingCopy::addMessage() {
-    add(pcapngCopy::readablePacket(_reader.block()));
+    addBlock(pcapngCopy::readablePacket(_reader.block()));
+    return _failure ? Result<Done>(*_failure) : Done{};
+}
+
+Result<Done> RecordingCopy::addFix(const Fix& fix) {
+    if (_hasPositions)
+        return Failure{"the recording has positions already"};
+    if (_isBigEndian)
+        return Failure{"positions cannot be added to a big-endian recording"};
+    add({});
+    if (!_positionInterface) {
+        _positionInterface = _interfaces++;
+        pcapngBlocks::appendPositionInterface(_buffer);
+    }
+    for (const std::string& sentence : nmeaSentences(fix))
+        pcapngBlocks::appendPacket(
+            _buffer, fix.time, Bytes(reinterpret_cast<const std::uint8_t*>(sentence.data()), sentence.size()),
+            *_positionInterface);
     return _failure ? Result<Done>(*_failure) : Done{};
 }
 
@@ -42,16 +60,22 @@ Result<Done> RecordingCopy::finish() {
 void RecordingCopy::addOther(const PcapngReader::Block& block) {
     if (block.type == pcapng::BlockType::SectionHeader) {
         _hasSection = true;
+        _isBigEndian = block.bigEndian;
+        _interfaces = 0;
+        _positionInterface.reset();
         add(pcapngCopy::sectionHeader(block));
     } else if (block.type == pcapng::BlockType::InterfaceDescription) {
         addInterface(block);
     } else if (pcapngCopy::mayBeCopied(block)) {
-        add(block.bytes);
+        addBlock({block.bytes.begin(), block.bytes.end()});
     }
 }
 
 void RecordingCopy::addInterface(const PcapngReader::Block& block) {
     const auto interface = InterfaceDescription::read(block.body(), block.bigEndian);
+    ++_interfaces;
+    _hasPositions = _hasPositions || (interface && interface->linkType == pcapng::positionLinkType &&
+                                      interface->name == pcapng::positionName);
     const bool isOfMessages = interface && interface->linkType == pcapng::logMessageLinkType;
     _hasInterface = _hasInterface || isOfMessages;
     const std::optional<std::string> name =
@@ -69,6 +93,13 @@ std::optional<std::string> RecordingCopy::newName(std::string_view name) const {
     if (!_names.technology.empty() && name != _names.technology && isFirst)
         return _names.technology;
     return std::nullopt;
+}
+
+/// Interfaces after the one of added positions have other numbers in the copy.
+void RecordingCopy::addBlock(std::vector<std::uint8_t> block) {
+    if (_positionInterface && *_positionInterface + 1 < _interfaces)
+        pcapngCopy::shiftInterface(block, *_positionInterface);
+    add(block);
 }
 
 void RecordingCopy::add(Bytes bytes) {

@@ -3,6 +3,7 @@
 
 #pragma once
 
+#include "Platform/Fix.h"
 #include "Platform/Result.h"
 #include "Recording/Files/OutputFile.h"
 #include "Recording/Pcapng/PcapngReader.h"
@@ -35,12 +36,16 @@ public:
 
     /// Adds the message that the reader last returned.
     Result<Done> addMessage();
+    /// Adds a fix, on an interface of positions that the copy gets. Fails where the recording has positions
+    /// of its own, and where it is big-endian.
+    Result<Done> addFix(const Fix& fix);
     /// Writes what is left, and the interface of the technology where the recording has none of messages.
     Result<Done> finish();
 
 private:
     void addOther(const PcapngReader::Block& block);
     void addInterface(const PcapngReader::Block& block);
+    void addBlock(std::vector<std::uint8_t> block);
     void add(Bytes bytes);
     void flush();
     /// The name in the copy of an interface of messages; absent where it keeps its own.
@@ -51,8 +56,12 @@ private:
     std::string _name;
     Names _names;
     std::vector<std::uint8_t> _buffer;
-    bool _hasSection = false;   ///< a section header has been added
-    bool _hasInterface = false; ///< an interface of messages has been added
+    std::uint32_t _interfaces = 0;                   ///< of the present section, in the copy
+    std::optional<std::uint32_t> _positionInterface; ///< of added fixes; in the present section
+    bool _hasPositions = false;                      ///< of the recording itself
+    bool _isBigEndian = false;                       ///< the present section
+    bool _hasSection = false;                        ///< a section header has been added
+    bool _hasInterface = false;                      ///< an interface of messages has been added
     std::optional<Failure> _failure;
 };
 

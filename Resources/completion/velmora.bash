@@ -119,7 +119,7 @@ _velmora_log() {
     for ((i = 1; i < cword; ++i)); do
         case ${words[i]} in
         --log | --log-level | --format | --every | --select | --from | --to | --code | --technology | --jobs | \
-            --max-age | --duration | --count | --timeout | --description | --role | --kind | --severity | --clock | \
+            --max-age | --max-gap | --track | --gps | --duration | --count | --timeout | --description | --role | --kind | --severity | --clock | \
             --rules | --exec | --exec-timeout | --fail-on | --by | --out | \
             --compact | --level | --key | --new-key | --known)
             ((++i))
@@ -211,7 +211,16 @@ _velmora_log() {
         _filedir -d
         return
         ;;
-    --max-age | --from | --to | --code | --jobs | --duration | --count | --timeout | --description | \
+    --track)
+        _filedir
+        return
+        ;;
+    --gps)
+        _filedir
+        mapfile -t -O ${#COMPREPLY[@]} COMPREPLY < <(compgen -W 'gpsd modem' -- "$cur")
+        return
+        ;;
+    --max-age | --max-gap | --from | --to | --code | --jobs | --duration | --count | --timeout | --description | \
         --exec-timeout)
         return # nothing that could be guessed
         ;;
@@ -228,10 +237,10 @@ _velmora_log() {
         fi
         return
         ;;
-    decode) options+=(--format --every --samples --wide --safe --max-age --select --from --to --code --warm --technology --mask --key --strict --jobs) ;;
+    decode) options+=(--format --every --samples --wide --positions --max-gap --safe --max-age --select --from --to --code --warm --technology --mask --key --strict --jobs) ;;
     watch) options+=(--once --timeout --bell --mask --key) ;;
-    record) options+=(--force --duration --count --timeout) ;;
-    convert) options+=(--force --from --to --code --technology --description --strict) ;;
+    record) options+=(--force --duration --count --timeout --gps) ;;
+    convert) options+=(--force --from --to --code --technology --description --strict --track --select --role --max-gap) ;;
     info) options+=(--format --technology) ;;
     fields) options+=(--technology --role --format --safe) ;;
     events) options+=(--format --safe --records --live --clock --technology --mask --key --kind --severity --from --to --rules

@@ -29,6 +29,7 @@ ScenarioEvent DriveScenario::next() {
 }
 
 void DriveScenario::advance() {
+    _stepStart = _now;
     drive(step_s);
     followTimeline();
     react();
@@ -44,6 +45,10 @@ void DriveScenario::advance() {
     }
     _now = end;
     addUnusualMessage();
+}
+
+RoadPlace DriveScenario::place() const {
+    return {nanosecondsOf(_stepStart), road().east_m(), road().north_m()};
 }
 
 void DriveScenario::followTimeline() {

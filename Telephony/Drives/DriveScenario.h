@@ -5,6 +5,7 @@
 
 #include "Telephony/Drives/DriveScript.h"
 #include "Telephony/Drives/PeriodicReport.h"
+#include "Telephony/Drives/RadioNetwork.h"
 #include "Telephony/Drives/Scenario.h"
 #include "Telephony/Drives/ScenarioRandom.h"
 #include "Telephony/Drives/Truth/DriveTruth.h"
@@ -33,6 +34,7 @@ public:
     DriveScenario& operator=(const DriveScenario&) = delete;
 
     [[nodiscard]] ScenarioEvent next() final;
+    [[nodiscard]] RoadPlace place() const final;
     void tellTruth(TruthSink& sink) final { _truth = makeTruth(sink); }
     void finishTruth() final;
 
@@ -59,6 +61,8 @@ protected:
 
     /// Moves the car: the network's levels change, and with them the phone's measurements.
     virtual void drive(double seconds) = 0;
+    /// Where the car is.
+    [[nodiscard]] virtual const RadioNetwork& road() const = 0;
     /// The phone's reaction to a measurement: reselection, area updates.
     virtual void react() = 0;
     /// Calls `schedule` for the reports of the phone's state.
@@ -102,6 +106,7 @@ private:
     ScenarioRandom _random;
     DriveScript _script;
     double _now = 0;
+    double _stepStart = 0; ///< of the last step
     std::size_t _phase = 0;
     double _phaseEnd = 0;
     double _betterSince = 0; ///< since when some cell has been better than the serving one

@@ -5,6 +5,7 @@
 
 #include "Platform/Bytes.h"
 #include "Telephony/Drives/DriveIdentities.h"
+#include "Telephony/Drives/Road/RoadPlace.h"
 #include "Telephony/Drives/Truth/TruthSink.h"
 
 #include <chrono>
@@ -27,6 +28,10 @@ public:
     [[nodiscard]] virtual std::string_view technology() const = 0;
     /// The next message; offsets never go back.
     [[nodiscard]] virtual ScenarioEvent next() = 0;
+
+    /// Where the car is: at the beginning of the step in which the last message was sent. Later messages are
+    /// not before it.
+    [[nodiscard]] virtual RoadPlace place() const = 0;
 
     /// The drive becomes that of this subscriber; the default is one of a test network. To be called before
     /// the first message.

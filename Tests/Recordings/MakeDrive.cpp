@@ -3,6 +3,7 @@
 
 #include "Recording/Pcapng/PcapngWriter.h"
 #include "Telephony/Drives/DriveScenario.h"
+#include "Telephony/Drives/Road/RoadReceiver.h"
 #include "Telephony/Drives/ScenarioRegistry.h"
 #include "Tests/Recordings/TruthFile.h"
 
@@ -11,18 +12,21 @@
 #include <chrono>
 #include <cstdint>
 #include <cstdio>
+#include <deque>
 #include <fstream>
 #include <limits>
 #include <memory>
 #include <optional>
 #include <string>
 #include <string_view>
+#include <utility>
 #include <vector>
 
 // Writes the beginning of a scenario's drive as a recording, stamped with the drive's own time and without
 // waiting for it: so many messages, or with "h" or "s" so many hours or seconds. The same arguments make the
 // same file; a FILE of - is standard output, so that a long drive need not be stored. With --truth it also
 // writes what the drive's phone did, as JSON lines; the recording is the same with and without it.
+// With --positions it has a receiver's sentences of the drive's own road as well, a fix a second.
 // With --identities the numbers and addresses are random ones of the seed, which it lists, one a line.
 
 namespace velmora {
@@ -55,21 +59,61 @@ std::optional<Length> lengthOf(std::string_view text) {
     return length;
 }
 
+/// Writes a drive's messages and, between them, the sentences of its receiver.
+class PositionedDrive {
+public:
+    explicit PositionedDrive(PcapngWriter& writer) : _writer(writer) {}
+
+    /// `place`: that of the scenario after the message.
+    Result<Done> append(Time time, Data message, const RoadPlace& place) {
+        for (const Fix& fix : _receiver.drivenTo(place)) {
+            if (const Result<Done> written = writeUntil(fix.time); !written)
+                return written;
+            if (const Result<Done> written = _writer.appendFix(fix); !written)
+                return written;
+        }
+        _waiting.emplace_back(time, std::move(message));
+        return writeUntil(DriveScenario::startTime() + place.offset);
+    }
+    Result<Done> finish() { return writeUntil(Time::max()); }
+
+private:
+    Result<Done> writeUntil(Time end) {
+        for (; !_waiting.empty() && _waiting.front().first < end; _waiting.pop_front()) {
+            const auto& [time, message] = _waiting.front();
+            if (const Result<Done> written = _writer.append(time, message.bytes()); !written)
+                return written;
+        }
+        return Done{};
+    }
+
+    PcapngWriter& _writer;
+    RoadReceiver _receiver{DriveScenario::startTime()};
+    std::deque<std::pair<Time, Data>> _waiting; ///< of the last step, up to whose end no place is known yet
+};
+
 /// Returns the offset of the last message.
-Result<TruthTime> make(Scenario& scenario, const Length& length, const std::string& path) {
-    Result<std::unique_ptr<PcapngWriter>> writer = PcapngWriter::create(path, scenario.technology());
+Result<TruthTime> make(Scenario& scenario, const Length& length, const std::string& path, bool hasPositions) {
+    using Positions = PcapngWriter::Positions;
+    Result<std::unique_ptr<PcapngWriter>> writer = PcapngWriter::create(
+        path, scenario.technology(), hasPositions ? Positions::With : Positions::Without);
     if (!writer)
         return Failure{writer.reason()};
+    PositionedDrive positioned(**writer);
     TruthTime last{0};
     for (std::uint64_t i = 0; i < length.messages; ++i) {
         const ScenarioEvent event = scenario.next();
         if (event.offset >= length.time)
             break;
         const Time time = DriveScenario::startTime() + event.offset;
-        if (const Result<Done> written = (*writer)->append(time, event.message.bytes()); !written)
+        const Result<Done> written = hasPositions ? positioned.append(time, event.message, scenario.place())
+                                                  : (*writer)->append(time, event.message.bytes());
+        if (!written)
             return Failure{written.reason()};
         last = event.offset;
     }
+    if (const Result<Done> written = positioned.finish(); !written)
+        return Failure{written.reason()};
     if (const Result<Done> closed = (*writer)->close(); !closed)
         return Failure{closed.reason()};
     return last;
@@ -77,10 +121,10 @@ Result<TruthTime> make(Scenario& scenario, const Length& length, const std::stri
 
 /// The same, with the truth beside it.
 Result<TruthTime> makeWithTruth(Scenario& scenario, const Length& length, const std::string& path,
-                                const std::string& truthPath) {
+                                bool hasPositions, const std::string& truthPath) {
     TruthFile truth;
     scenario.tellTruth(truth);
-    Result<TruthTime> last = make(scenario, length, path);
+    Result<TruthTime> last = make(scenario, length, path, hasPositions);
     if (!last)
         return last;
     scenario.finishTruth();
@@ -112,17 +156,19 @@ bool plantIdentities(Scenario& scenario, std::uint64_t seed, const std::string& 
 
 int run(std::vector<std::string> arguments) {
     const std::optional<std::string> truth = takeOption(arguments, "--truth");
+    const bool hasPositions = std::erase(arguments, "--positions") > 0;
     const std::optional<std::string> identities = takeOption(arguments, "--identities");
     const bool isComplete = arguments.size() == 4;
     const ScenarioKind* kind = isComplete ? scenarioKindNamed(arguments[0]) : nullptr;
     const std::optional<std::uint64_t> seed = isComplete ? numberOf(arguments[1]) : std::nullopt;
     const std::optional<Length> length = isComplete ? lengthOf(arguments[2]) : std::nullopt;
     if (!kind || !seed || !length) {
-        std::fprintf(stderr,
-                     "usage: make-drive SCENARIO SEED MESSAGES|HOURSh|SECONDSs FILE [--truth FILE] "
-                     "[--identities FILE]\n"
-                     "scenarios: %s\n",
-                     scenarioNames().c_str());
+        std::fprintf(
+            stderr,
+            "usage: make-drive SCENARIO SEED MESSAGES|HOURSh|SECONDSs FILE [--truth FILE] [--positions] "
+            "[--identities FILE]\n"
+            "scenarios: %s\n",
+            scenarioNames().c_str());
         return 2;
     }
     const std::unique_ptr<Scenario> scenario = kind->make(*seed);
@@ -130,8 +176,9 @@ int run(std::vector<std::string> arguments) {
         std::fprintf(stderr, "make-drive: cannot write %s\n", identities->c_str());
         return 1;
     }
-    const Result<TruthTime> made = truth ? makeWithTruth(*scenario, *length, arguments[3], *truth)
-                                         : make(*scenario, *length, arguments[3]);
+    const Result<TruthTime> made = truth
+                                       ? makeWithTruth(*scenario, *length, arguments[3], hasPositions, *truth)
+                                       : make(*scenario, *length, arguments[3], hasPositions);
     if (!made) {
         std::fprintf(stderr, "make-drive: %s\n", made.reason().c_str());
         return 1;

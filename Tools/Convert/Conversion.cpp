@@ -15,6 +15,8 @@
 #include "Recording/Pcapng/PcapngWriter.h"
 #include "Recording/Pcapng/RecordingCopy.h"
 #include "Recording/Refreshes/RefreshTicks.h"
+#include "Tools/Convert/AddedPositions.h"
+#include "Tools/Convert/TrackConversion.h"
 #include "Tools/Decode/Decoding.h"
 #include "Tools/Messages/TechnologyChoice.h"
 #include "Tools/Report.h"
@@ -89,9 +91,16 @@ Result<bool> copyRecording(PcapngReader& reader, const Conversion& conversion, i
     Result<Messages> messages = begin(reader, conversion);
     if (!messages)
         return Failure{messages.reason()};
-    for (; messages->next; messages->advance())
+    AddedPositions positions(conversion.positions);
+    const auto add = [&copy](const Fix& fix) { return copy.addFix(fix); };
+    for (; messages->next; messages->advance()) {
+        if (const auto added = positions.upTo(messages->next->time, add); !added)
+            return Failure{conversion.title + ": " + added.reason()};
         if (const auto added = copy.addMessage(); !added)
             return Failure{added.reason()};
+    }
+    if (const auto added = positions.finish(add); !added)
+        return Failure{conversion.title + ": " + added.reason()};
     if (!choice->override.empty() && reader.technologies().size() > 1)
         return Failure{conversion.title + ": " + severalTechnologies(reader.technologies()) +
                        " of a regular file only"};
@@ -109,13 +118,23 @@ Result<bool> toRecording(MessageReader& reader, const Conversion& conversion, in
     const Result<int> own = ownDescriptor(descriptor, conversion.name);
     if (!own)
         return Failure{own.reason()};
-    const auto writer = PcapngWriter::adopt(*own, conversion.name, messages->technology);
+    using Positions = PcapngWriter::Positions;
+    const auto writer =
+        PcapngWriter::adopt(*own, conversion.name, messages->technology,
+                            conversion.positions.empty() ? Positions::Without : Positions::With);
     if (!writer)
         return Failure{writer.reason()};
-    for (; messages->next; messages->advance())
+    AddedPositions positions(conversion.positions);
+    const auto add = [&writer](const Fix& fix) { return (*writer)->appendFix(fix); };
+    for (; messages->next; messages->advance()) {
+        if (const auto added = positions.upTo(messages->next->time, add); !added)
+            return Failure{conversion.title + ": " + added.reason()};
         if (const auto appended = (*writer)->append(messages->next->time, messages->next->message.bytes());
             !appended)
             return Failure{appended.reason()};
+    }
+    if (const auto added = positions.finish(add); !added)
+        return Failure{conversion.title + ": " + added.reason()};
     if (const auto closed = (*writer)->close(); !closed)
         return Failure{closed.reason()};
     return true;
@@ -218,17 +237,31 @@ std::optional<FileForm> formFromName(std::string_view name) {
         return FileForm::Snapshot;
     if (name.ends_with(".dlf"))
         return FileForm::DLFLog;
+    if (name.ends_with(".gpx"))
+        return FileForm::GPX;
+    if (name.ends_with(".geojson"))
+        return FileForm::GeoJSON;
+    if (name.ends_with(".kml"))
+        return FileForm::KML;
     return std::nullopt;
 }
 
 Result<bool> convertMessages(MessageReader& reader, const Conversion& conversion, int descriptor,
                              WorkContext& context) {
-    switch (conversion.form) {
-    case FileForm::Recording: return toRecording(reader, conversion, descriptor);
-    case FileForm::DLFLog: return toDLFLog(reader, conversion, descriptor);
-    case FileForm::Snapshot: break;
-    }
-    return toSnapshot(reader, conversion, descriptor, context);
+    if (isTrack(conversion.form))
+        return convertToTrack(reader, conversion, descriptor, context);
+    if (conversion.form == FileForm::Recording)
+        return toRecording(reader, conversion, descriptor);
+    std::uint64_t sentences = 0;
+    reader.setSentences([&sentences](const PositionSentence&) { ++sentences; });
+    Result<bool> converted = conversion.form == FileForm::DLFLog
+                                 ? toDLFLog(reader, conversion, descriptor)
+                                 : toSnapshot(reader, conversion, descriptor, context);
+    reader.setSentences({});
+    if (converted && sentences > 0)
+        report(conversion.title + ": left out " + std::to_string(sentences) + " sentences of positions: " +
+               (conversion.form == FileForm::DLFLog ? "a DLF log" : "a snapshot") + " has none");
+    return converted;
 }
 
 } // namespace velmora

@@ -4,7 +4,9 @@
 #include "Tools/Convert/ConvertCommand.h"
 
 #include "Platform/Linux/Files/AtomicFile.h"
+#include "Platform/Linux/Files/Files.h"
 #include "Recording/OpenMessages.h"
+#include "Recording/Positions/TrackFile.h"
 #include "Tools/Convert/Conversion.h"
 #include "Tools/Decode/Decoding.h"
 #include "Tools/Decode/RefreshCount.h"
@@ -13,11 +15,14 @@
 #include "Tools/OutputGuard.h"
 #include "Tools/OverwriteTarget.h"
 #include "Tools/Report.h"
+#include "Tools/Stats/StatsOptions.h"
 
 #include <filesystem>
 #include <memory>
 #include <optional>
 #include <string>
+#include <utility>
+#include <vector>
 
 #include <sys/stat.h>
 #include <unistd.h>
@@ -40,9 +45,32 @@ std::optional<std::uint64_t> refreshesOf(const std::string& file, const Conversi
     return countRefreshes(**reader, conversion.messages, choice->only);
 }
 
+/// What a track shows: what was chosen, or how good reception was.
+LeafChoice attributesOf(const ConvertOptions& options) {
+    LeafChoice choice = leafChoice(options.selection, options.roles);
+    if (choice.isEverything()) {
+        choice.addRole(Role::ServingLevel);
+        choice.addRole(Role::ServingQuality);
+    }
+    return choice;
+}
+
+/// Of the file with the track; none without one.
+Result<std::vector<Fix>> positionsOf(const ConvertOptions& options) {
+    if (options.track.empty())
+        return std::vector<Fix>();
+    const Result<Data> content = readFile(options.track, maximumTrackFile);
+    if (!content)
+        return Failure{options.track + ": " + content.reason()};
+    const Bytes bytes = content->bytes();
+    Result<std::vector<Fix>> fixes =
+        fixesOfTrackFile({reinterpret_cast<const char*>(bytes.data()), bytes.size()});
+    return fixes ? std::move(fixes) : Failure{options.track + ": " + fixes.reason()};
+}
+
 /// Whether all of the input is in the output now.
 bool convert(const ConvertOptions& options, const std::filesystem::path& target, MessageReader& reader,
-             const std::string& title) {
+             const std::string& title, std::vector<Fix> positions) {
     // Before the output, so that an allocation that fails never leaves one on the disk.
     AtomicFile* made = nullptr;
     WorkContext context(title, [&made] {
@@ -59,12 +87,16 @@ bool convert(const ConvertOptions& options, const std::filesystem::path& target,
     Conversion conversion;
     conversion.form = *formFromName(options.out);
     conversion.title = title;
+    conversion.path = options.file;
     conversion.name = options.out;
     conversion.technology = options.technology;
     if (!options.technology.empty())
         conversion.technologies = technologiesOf(options.file);
     conversion.messages = options.messages;
     conversion.description = options.description;
+    conversion.attributes = attributesOf(options);
+    conversion.maximumGap = options.maximumGap;
+    conversion.positions = std::move(positions);
     conversion.isStrict = options.isStrict;
     if (conversion.form == FileForm::Snapshot)
         conversion.refreshes = refreshesOf(options.file, conversion);
@@ -92,13 +124,18 @@ int runConvert(const ConvertOptions& options) {
         report(target.reason());
         return ExitStatus::BadInput;
     }
+    Result<std::vector<Fix>> positions = positionsOf(options);
+    if (!positions) {
+        report(positions.reason());
+        return ExitStatus::BadInput;
+    }
     const std::string title = fileTitle(options.file);
     const Result<std::unique_ptr<MessageReader>> reader = openMessages(options.file);
     if (!reader) {
         report(title + ": " + reader.reason());
         return ExitStatus::BadInput;
     }
-    const bool converted = convert(options, *target, **reader, title);
+    const bool converted = convert(options, *target, **reader, title, *std::move(positions));
     const bool whole = reportLosses(**reader, title);
     return converted && whole ? ExitStatus::Done : ExitStatus::BadInput;
 }

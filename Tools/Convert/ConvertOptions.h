@@ -3,8 +3,12 @@
 
 #pragma once
 
+#include "Analysis/Tracks/Track.h"
+#include "Tools/Decode/Paths/NodeSelection.h"
+#include "Tools/Fields/RoleSelection.h"
 #include "Tools/Messages/MessageSelection.h"
 
+#include <chrono>
 #include <string>
 
 namespace CLI {
@@ -20,10 +24,14 @@ struct ConvertOptions {
     /// The output; precondition: its name has a form, see `formFromName`.
     std::string out;
     MessageSelection messages;
-    bool force = false;      ///< replace an existing file
-    std::string technology;  ///< overrides the file's; empty for the file's
-    std::string description; ///< a snapshot's
-    bool isStrict = false;   ///< for a snapshot: see DecodeOptions
+    std::string track;       ///< a file of positions that the recording gets; empty for none
+    NodeSelection selection; ///< the attributes of a track, with the roles
+    RoleSelection roles;     ///< of both none for the serving cell's level and quality
+    std::chrono::nanoseconds maximumGap = Track::defaultGap; ///< between the fixes of a track
+    bool force = false;                                      ///< replace an existing file
+    std::string technology;                                  ///< overrides the file's; empty for the file's
+    std::string description;                                 ///< a snapshot's
+    bool isStrict = false;                                   ///< for a snapshot: see DecodeOptions
 };
 
 /// Adds the command with its options, help and examples. Parsing fills `options`, which must outlive `app`.

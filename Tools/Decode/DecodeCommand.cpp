@@ -3,6 +3,7 @@
 
 #include "Tools/Decode/DecodeCommand.h"
 
+#include "Export/Tracks/PositionedReader.h"
 #include "Platform/PrintableText.h"
 #include "Recording/OpenMessages.h"
 #include "Tools/Decode/CSVRows.h"
@@ -120,7 +121,12 @@ bool decodeFile(std::size_t index, bool showsProgress, Work& work, DecoderLines&
     request.progress = progress ? progress->get() : nullptr;
     // Over the progress line, which only lines that are written replace.
     const DecoderLog log(lines);
-    MaskedInput input(**reader, path, request.technology, request.technologies, work.masking);
+    // Below the mask, so that the position is that of the message by its own time.
+    std::optional<PositionedReader> positioned;
+    if (options.hasPositions)
+        writer->setPositions(positioned.emplace(**reader, options.maximumGap));
+    MessageReader& messages = positioned ? *positioned : **reader;
+    MaskedInput input(messages, path, request.technology, request.technologies, work.masking);
     const Result<DecodedFile> decoded = decodeMessages(input.reader(), request, context, *writer);
     clearProgress();
     if (decoded)

@@ -4,6 +4,7 @@
 #include "Tools/Decode/DecodeOptions.h"
 
 #include "Tools/CommandOptions.h"
+#include "Tools/Messages/PositionOptions.h"
 #include "Tools/Messages/SelectionOptions.h"
 
 namespace velmora {
@@ -88,6 +89,13 @@ CLI::App* addDecode(CLI::App& app, DecodeOptions& options) {
             "With --samples and csv: a row for each message that reported a selected value, a column for "
             "each selected leaf, a row of its own for each row of a list")
         ->needs(samples);
+    CLI::Option* const positions =
+        command->add_flag("--positions", options.hasPositions,
+                          "With --samples: latitude, longitude, altitude, speed, age of the fix, HDOP and "
+                          "standard deviation at "
+                          "each message's time, empty where the recording has no position then");
+    positions->needs(samples);
+    addMaximumGap(*command, options.maximumGap)->needs(positions);
     addSafe(*command, options.guard);
     command
         ->add_option_function<double>(
@@ -141,6 +149,8 @@ CLI::App* addDecode(CLI::App& app, DecodeOptions& options) {
         "  velmora-log decode --samples --format csv --select 'level=/GSM/GSM Serving Cell/RSSI' "
         "drive.pcapng\n"
         "  velmora-log decode --samples --format jsonl --select '/GSM/Neighboring Cells/*/RSSI' "
+        "drive.pcapng\n"
+        "  velmora-log decode --samples --positions --format csv --select 'level=/GSM/GSM Serving Cell/RSSI' "
         "drive.pcapng\n"
         "  velmora-log decode --max-age 5 --format csv --select '/GSM/GSM Serving Cell/RSSI' drive.pcapng\n"
         "  velmora-log decode --warm --from 2026-11-16T05:00:00Z --format jsonl drive.pcapng\n"

@@ -3,6 +3,7 @@
 
 #pragma once
 
+#include "Analysis/Tracks/Track.h"
 #include "Tools/Decode/Paths/NodeSelection.h"
 #include "Tools/Mask/MaskOption.h"
 #include "Tools/Messages/MessageSelection.h"
@@ -38,7 +39,9 @@ struct DecodeOptions {
     NodeSelection selection; ///< not empty for Csv without or with wide samples
     /// For JsonLines and Csv at each refresh: older values are left out. Absent for no limit.
     std::optional<std::chrono::nanoseconds> maximumAge;
-    CSVGuard guard = CSVGuard::Off; ///< for Csv alone
+    bool hasPositions = false;                               ///< samples have the position of their message
+    std::chrono::nanoseconds maximumGap = Track::defaultGap; ///< between fixes; with positions
+    CSVGuard guard = CSVGuard::Off;                          ///< for Csv alone
     MessageSelection messages;
     std::string technology; ///< overrides the file's, or chooses one of several; empty for the file's
     bool isStrict = false;  ///< a message that ends the application ends decoding as well

@@ -12,6 +12,7 @@
 namespace velmora {
 
 class Output;
+class PositionedReader;
 class SampleColumns;
 
 /// What `decode` prints of a file, in one of its formats: during decoding or at its end.
@@ -24,6 +25,8 @@ public:
                                                             bool isLive, SampleColumns& columns,
                                                             Output& output);
 
+    /// Where the positions of the messages are read; for writers of samples. It must outlive the writer.
+    virtual void setPositions(const PositionedReader& /*positions*/) {}
     /// The file has been decoded to its end; called for each of its technologies.
     virtual void finish(const Decoded&) {}
     /// Writes out what is complete, and nothing else: decoding may have ended in the middle of a message.

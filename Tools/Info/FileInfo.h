@@ -9,6 +9,7 @@
 
 #include <cstdint>
 #include <functional>
+#include <optional>
 #include <string>
 #include <vector>
 
@@ -28,9 +29,18 @@ struct TechnologyInfo {
     CodeNames names;
 };
 
+/// What a file holds of positions.
+struct PositionInfo {
+    std::uint64_t fixes = 0;
+    std::optional<Time> first; ///< of them
+    std::optional<Time> last;
+    std::uint64_t messages = 0; ///< with a position
+};
+
 /// What a file holds, beside what its reader says.
 struct FileInfo {
     std::vector<TechnologyInfo> technologies; ///< in the file's order; at least one
+    PositionInfo positions;
     UndecodedMessages undecoded;
 };
 

@@ -123,6 +123,13 @@ void InfoCollector::start(const std::string& name) {
     _decodings.push_back(std::move(decoding));
 }
 
+void InfoCollector::add(const Fix& fix) {
+    PositionInfo& positions = _info.positions;
+    ++positions.fixes;
+    positions.first = std::min(positions.first.value_or(fix.time), fix.time);
+    positions.last = std::max(positions.last.value_or(fix.time), fix.time);
+}
+
 void InfoCollector::add(const LoggedMessage& message) {
     if (_choice.only && message.technology != *_choice.only)
         return;
@@ -130,6 +137,7 @@ void InfoCollector::add(const LoggedMessage& message) {
     startUpTo(index);
     MessageSummary& summary = _info.technologies[index].summary;
     const std::optional<std::uint32_t> code = summary.add(message);
+    _info.positions.messages += _reader.position() ? 1 : 0;
     Decoding& decoding = *_decodings[index];
     if (!decoding.decoder)
         return;

@@ -3,6 +3,7 @@
 
 #pragma once
 
+#include "Export/Tracks/PositionedReader.h"
 #include "LogGenerator/Extra/PayloadCache.h"
 #include "LogGenerator/LogGenerator.h"
 #include "PropertyLists/Value.h"
@@ -25,7 +26,9 @@ public:
     /// `technologies`: those of the whole file where they have been found out beforehand. Both must outlive
     /// it.
     InfoCollector(MessageReader& reader, const std::vector<std::string>& technologies)
-        : _reader(reader), _beforehand(technologies) {}
+        : _reader(reader), _beforehand(technologies) {
+        _reader.setFixes([this](const Fix& fix) { add(fix); });
+    }
 
     /// Reads to the end. `technology` overrides the file's, or chooses one; empty for the file's. Fails where
     /// a file of several technologies does not have the chosen one.
@@ -48,8 +51,9 @@ private:
     void start(const std::string& name);
     void startUpTo(std::size_t technology);
     void add(const LoggedMessage& message);
+    void add(const Fix& fix);
 
-    MessageReader& _reader;
+    PositionedReader _reader;
     const std::vector<std::string>& _beforehand;
     TechnologyChoice _choice;
     MessageClock _clock;

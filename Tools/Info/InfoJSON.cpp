@@ -113,6 +113,15 @@ Value commentsValue(const Comments& comments) {
     return value;
 }
 
+Value positionsValue(const PositionInfo& positions) {
+    const DictionaryRef value = makeDictionary();
+    value->set("fixes", number(positions.fixes));
+    value->set("first", timeValue(*positions.first));
+    value->set("last", timeValue(*positions.last));
+    value->set("messages", number(positions.messages));
+    return value;
+}
+
 } // namespace
 
 std::string infoJson(const std::string& file, const FileInfo& info, const MessageReader& reader) {
@@ -124,6 +133,8 @@ std::string infoJson(const std::string& file, const FileInfo& info, const Messag
     for (const TechnologyInfo& technology : info.technologies)
         technologies->append(technologyValue(technology));
     object->set("technologies", technologies);
+    if (info.positions.fixes > 0)
+        object->set("positions", positionsValue(info.positions));
     object->set("losses", lossesValue(reader));
     object->set("comments", commentsValue(reader.comments()));
     TextBuffer text;

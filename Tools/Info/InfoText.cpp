@@ -106,6 +106,24 @@ std::string commentLines(const Comments& comments) {
     return text;
 }
 
+/// Nothing for a file without positions.
+std::string positionLines(const FileInfo& info) {
+    const PositionInfo& positions = info.positions;
+    if (positions.fixes == 0)
+        return {};
+    std::uint64_t messages = 0;
+    for (const TechnologyInfo& technology : info.technologies)
+        messages += technology.summary.messages();
+    char share[32];
+    std::snprintf(share, sizeof share, "%.1f %%",
+                  messages == 0
+                      ? 0.0
+                      : 100.0 * static_cast<double>(positions.messages) / static_cast<double>(messages));
+    return "positions:  " + std::to_string(positions.fixes) + " (" + timeText(*positions.first) + " to " +
+           timeText(*positions.last) + ")\n" + "positioned: " + std::to_string(positions.messages) + " of " +
+           std::to_string(messages) + " messages (" + share + ")\n";
+}
+
 std::string technologyLines(const TechnologyInfo& technology) {
     const MessageSummary& summary = technology.summary;
     std::string text =
@@ -138,7 +156,7 @@ std::string codeLines(const TechnologyInfo& technology) {
 std::string infoText(const FileInfo& info, const MessageReader& reader) {
     std::string text =
         "form:       " + std::string(reader.form()) + (reader.isCompressed() ? ", gzip'd\n" : "\n");
-    const std::string damage = lossLines(reader) + commentLines(reader.comments());
+    const std::string damage = positionLines(info) + lossLines(reader) + commentLines(reader.comments());
     if (info.technologies.size() == 1) {
         const TechnologyInfo& only = info.technologies.front();
         return text + technologyLines(only) + damage + codeLines(only);

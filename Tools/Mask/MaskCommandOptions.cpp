@@ -15,14 +15,17 @@ CLI::App* addMask(CLI::App& app, MaskCommandOptions& options) {
         app.add_subcommand("mask", "Copy a recording, snapshot or DLF log without identities, or check one");
     CLI::Option* file =
         command->add_option("FILE", options.file, "What to mask; - is standard input")->type_name("");
-    CLI::Option* out =
-        command
-            ->add_option("OUT", options.out,
-                         "The output; its suffix selects the form: .pcapng a recording, "
-                         ".velmora a snapshot, .dlf a DLF log")
-            ->check(validator([](const std::string& name) { return formFromName(name).has_value(); },
-                              std::string("a name that ends in ") + formSuffixes))
-            ->type_name("");
+    CLI::Option* out = command
+                           ->add_option("OUT", options.out,
+                                        "The output; its suffix selects the form: .pcapng a recording, "
+                                        ".velmora a snapshot, .dlf a DLF log")
+                           ->check(validator(
+                               [](const std::string& name) {
+                                   const auto form = formFromName(name);
+                                   return form && !isTrack(*form);
+                               },
+                               std::string("a name that ends in ") + messageSuffixes))
+                           ->type_name("");
     command
         ->add_option_function<std::string>(
             "--level",

@@ -12,6 +12,7 @@
 #include "PropertyLists/PropertyList.h"
 #include "Recording/Files/DescriptorFile.h"
 #include "Recording/OpenMessages.h"
+#include "Recording/Positions/NMEASentence.h"
 #include "Tools/Convert/Conversion.h"
 #include "Tools/Messages/TechnologyChoice.h"
 #include "Tools/Report.h"
@@ -37,6 +38,12 @@ Result<bool> toRecording(MessageReader& reader, const TechnologyChoice& choice, 
     MaskedRecording recording(std::make_unique<DescriptorFile>(descriptor, false), name,
                               sealOf(mask.options()));
     reader.setReadsAllTechnologies(choice.override.empty());
+    // A sentence without a kind is a maker's own, and may hold the receiver's number.
+    if (mask.options().level != MaskLevel::All)
+        reader.setSentences([&recording](const PositionSentence& each) {
+            if (const auto sentence = NMEASentence::parse(each.text); sentence && !sentence->kind().empty())
+                recording.addSentence(each.time, each.text);
+        });
     std::vector<std::string> names;
     while (const std::optional<LoggedMessage> read = reader.next()) {
         if (choice.only && read->technology != *choice.only)

@@ -4,6 +4,7 @@
 #include "Tools/Record/RecordCommand.h"
 
 #include "Tools/ExitStatus.h"
+#include "Tools/Record/Positions/RecordedPositions.h"
 #include "Tools/Record/Recorder.h"
 #include "Tools/Record/RecordingSession.h"
 #include "Tools/Report.h"
@@ -17,11 +18,13 @@ namespace velmora {
 namespace {
 
 /// Reports what has been recorded, and what has not. Returns the exit status.
-int sumUp(const RecordingSession& recording, int status) {
+int sumUp(const RecordingSession& recording, bool hasPositions, int status) {
     const pcapngBlocks::PacketCount unsaved = recording.unsaved();
     std::string text = "recorded " + std::to_string(recording.messages() - unsaved.messages) +
                        " messages of " + recording.technology() + ", " +
                        std::to_string(recording.bytes() - unsaved.bytes) + " bytes";
+    if (hasPositions)
+        text += ", and " + std::to_string(recording.sentences()) + " sentences of positions";
     if (!recording.moves().empty()) {
         text +=
             ", the last " + std::to_string(recording.messagesSinceMove() - unsaved.messages) + " of them in ";
@@ -41,6 +44,12 @@ int sumUp(const RecordingSession& recording, int status) {
 } // namespace
 
 int runRecord(const RecordOptions& options, DecoderLines& lines) {
+    RecordedPositions positions(options.positions.empty() ? PositionChoice()
+                                                          : positionChoice(options.positions));
+    if (const Result<Done> loaded = positions.load(); !loaded) {
+        report(loaded.reason());
+        return ExitStatus::BadInput;
+    }
     const RecordingSession* opened = nullptr;
     const WorkContext context(options.file, [&opened] {
         if (opened)
@@ -54,8 +63,10 @@ int runRecord(const RecordOptions& options, DecoderLines& lines) {
     }
     RecordingSession& recording = **session;
     opened = &recording;
+    if (positions.areWanted())
+        recording.setHasPositions();
     ServiceClient client;
-    int status = Recorder(options, recording, lines, client).run();
+    int status = Recorder(options, recording, lines, client, positions).run();
     const std::size_t reportedMoves = recording.moves().size();
     const Result<Done> closed = recording.close();
     for (std::size_t move = reportedMoves; move < recording.moves().size(); ++move)
@@ -69,7 +80,7 @@ int runRecord(const RecordOptions& options, DecoderLines& lines) {
             report("nothing was recorded: the telephony service has named no technology");
         return ExitStatus::BadInput;
     }
-    return sumUp(recording, status);
+    return sumUp(recording, positions.areWanted(), status);
 }
 
 } // namespace velmora

@@ -34,6 +34,13 @@ CLI::App* addRecord(CLI::App& app, RecordOptions& options) {
             "wait")
         ->check(positiveSeconds())
         ->type_name("SECONDS");
+    command
+        ->add_option(
+            "--gps", options.positions,
+            "Record positions as well: of gpsd (gpsd:HOST:PORT; localhost:2947 by default); modem: as the "
+            "modem reports them; a file: GPX or NMEA sentences by their time, or a device or pipe that "
+            "NMEA sentences come from")
+        ->type_name("gpsd[:HOST[:PORT]]|modem|FILE");
     command->footer(
         "Messages are written, and their sync to storage started, within half a second. A failed write\n"
         "and a lost service are reported immediately; up to 32 MiB of messages are queued, and recording\n"
@@ -43,6 +50,7 @@ CLI::App* addRecord(CLI::App& app, RecordOptions& options) {
         "a new file beside it, such as drive-2.pcapng, and the exit status is 1.\n\n"
         "Examples:\n"
         "  velmora-log record drive.pcapng\n"
+        "  velmora-log record --gps gpsd drive.pcapng\n"
         "  velmora-log record --duration 600 --force drive.pcapng\n"
         "  velmora-log record - | velmora-log info -");
     return command;

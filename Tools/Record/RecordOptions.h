@@ -19,6 +19,7 @@ struct RecordOptions {
     bool force = false; ///< overwrite an existing file
     std::optional<double> duration_seconds;
     std::optional<std::uint64_t> count;    ///< messages
+    std::string positions;                 ///< as `--gps` has it; empty for none
     std::optional<double> timeout_seconds; ///< how long to wait for a service at the start
 };
 

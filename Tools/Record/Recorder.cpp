@@ -33,8 +33,9 @@ std::chrono::nanoseconds nanosecondsOf(double seconds) {
 } // namespace
 
 Recorder::Recorder(const RecordOptions& options, RecordingSession& session, DecoderLines& lines,
-                   ServiceClient& client)
-    : _options(options), _session(session), _client(client), _news(session, client.clock.now()),
+                   ServiceClient& client, RecordedPositions& positions)
+    : _options(options), _session(session), _client(client), _positions(positions),
+      _news(session, client.clock.now()),
       _log(lines, [this](const std::string& problem) { reportProblem(problem); }) {
     RecordingModel::Events events;
     events.connecting = [this] {
@@ -63,8 +64,11 @@ int Recorder::run() {
         _client.queue.after(nanosecondsOf(*_options.timeout_seconds), [this] { giveUp(); });
     const std::unique_ptr<Timer> saving = _client.queue.repeating(saveInterval, [this] { save(); });
     const std::unique_ptr<Timer> retrying = _client.queue.repeating(progressInterval, [this] { retry(); });
+    _positions.start(_client, {[this](Time time, std::string_view sentence) { takeSentence(time, sentence); },
+                               [this](const std::string& text) { _news.notify(text); }});
     showProgress();
     const int status = _client.loop.run();
+    _positions.stop();
     _model->destroyPorts();
     _news.endProgress();
     return status;
@@ -90,10 +94,17 @@ bool Recorder::learn(std::string_view technology, bool hasDecoder) {
 void Recorder::take(const Data& message) {
     if (_ended)
         return;
-    if (check(_session.append(_client.clock.now(), message.bytes())) && _options.count &&
+    const Time now = _client.clock.now();
+    _positions.willRecord(now, message.bytes());
+    if (!_ended && check(_session.append(now, message.bytes())) && _options.count &&
         _session.messages() >= *_options.count)
         end(ExitStatus::Done);
     else if (_session.isLive())
+        saveSoon();
+}
+
+void Recorder::takeSentence(Time time, std::string_view sentence) {
+    if (!_ended && check(_session.appendSentence(time, sentence)) && _session.isLive())
         saveSoon();
 }
 

@@ -4,6 +4,7 @@
 #pragma once
 
 #include "Tools/Log/ServiceLog.h"
+#include "Tools/Record/Positions/RecordedPositions.h"
 #include "Tools/Record/RecordOptions.h"
 #include "Tools/Record/RecordingModel.h"
 #include "Tools/Record/RecordingNews.h"
@@ -20,9 +21,9 @@ namespace velmora {
 /// thread only.
 class Recorder {
 public:
-    /// All four must outlive this.
+    /// All five must outlive this.
     Recorder(const RecordOptions& options, RecordingSession& session, DecoderLines& lines,
-             ServiceClient& client);
+             ServiceClient& client, RecordedPositions& positions);
 
     /// Runs the client's event loop. Returns the exit status.
     int run();
@@ -30,6 +31,7 @@ public:
 private:
     bool learn(std::string_view technology, bool hasDecoder);
     void take(const Data& message);
+    void takeSentence(Time time, std::string_view sentence);
     void endWithSource();
     void save();
     void saveSoon();
@@ -45,6 +47,7 @@ private:
     const RecordOptions& _options;
     RecordingSession& _session;
     ServiceClient& _client;
+    RecordedPositions& _positions;
     RecordingNews _news;
     ServiceLog _log; ///< over the progress line of the news, which only lines that are written replace
     std::shared_ptr<RecordingModel> _model;

@@ -66,14 +66,14 @@ Result<Done> RecordingSession::setTechnology(std::string_view technology) {
 
 Result<std::unique_ptr<PcapngWriter>> RecordingSession::startWriter(std::string_view technology) {
     if (_file.path == "-")
-        return PcapngWriter::create(_file.path, technology);
+        return PcapngWriter::create(_file.path, technology, _positions);
     if (_file.isRegular() && !_file.isEmpty())
         return overwriteWith(technology);
     Result<std::unique_ptr<DescriptorFile>> file = secondDescriptor(_file.descriptor.get(), _file.path);
     if (!file)
         return Failure{file.reason()};
     (*file)->watchForChanges(_file.path);
-    return PcapngWriter::start(*std::move(file), _file.path, technology);
+    return PcapngWriter::start(*std::move(file), _file.path, technology, _positions);
 }
 
 /// A file that is to be overwritten stays as it is until the new one has its head.
@@ -90,7 +90,7 @@ Result<std::unique_ptr<PcapngWriter>> RecordingSession::overwriteWith(std::strin
         return Failure{file.reason()};
     DescriptorFile& written = **file;
     Result<std::unique_ptr<PcapngWriter>> writer =
-        PcapngWriter::start(*std::move(file), _file.path, technology);
+        PcapngWriter::start(*std::move(file), _file.path, technology, _positions);
     if (!writer)
         return writer;
     if (const Result<Done> head = (*writer)->flush(); !head) // it may be waiting
@@ -107,6 +107,13 @@ Result<Done> RecordingSession::append(Time time, Bytes message) {
     if (_writer->messages() != before)
         _bytes += message.size();
     return keepTemporaryError(std::move(appended));
+}
+
+Result<Done> RecordingSession::appendSentence(Time time, std::string_view sentence) {
+    if (!_writer)
+        return Done{};
+    ++_sentences;
+    return keepTemporaryError(_writer->appendSentence(time, sentence));
 }
 
 Result<Done> RecordingSession::save() {

@@ -30,6 +30,9 @@ public:
     /// `force`; even then it keeps its content until the technology is known.
     static Result<std::unique_ptr<RecordingSession>> open(const std::string& path, bool force);
 
+    /// The recording gets positions. Call it before the technology is known.
+    void setHasPositions() { _positions = PcapngWriter::Positions::With; }
+
     ~RecordingSession();
     RecordingSession(const RecordingSession&) = delete;
     RecordingSession& operator=(const RecordingSession&) = delete;
@@ -40,6 +43,9 @@ public:
     /// A message has arrived. A failure ends the recording; a temporary error is not a failure (see
     /// `temporaryError`). Precondition: the technology is known.
     Result<Done> append(Time time, Bytes message);
+    /// A sentence of the receiver has arrived; as a message. It is lost while the technology is unknown.
+    /// Precondition: the recording has positions.
+    Result<Done> appendSentence(Time time, std::string_view sentence);
     /// Writes the buffer to the file and starts its sync to storage; does nothing before the technology is
     /// known but to notice that others have changed the file. Retries after a temporary error. A failure is
     /// as above.
@@ -57,6 +63,8 @@ public:
     [[nodiscard]] pcapngBlocks::PacketCount unsaved() const {
         return _writer ? _writer->unsaved() : pcapngBlocks::PacketCount();
     }
+    /// Sentences of the receiver that arrived.
+    [[nodiscard]] std::uint64_t sentences() const { return _sentences; }
     /// Messages dropped while the file could not be written.
     [[nodiscard]] std::uint64_t dropped() const { return _writer ? _writer->droppedMessages() : 0; }
     /// The temporary error; empty when there is none. Messages are queued meanwhile.
@@ -99,6 +107,8 @@ private:
     std::string _technology;
     std::string _temporaryError;
     std::uint64_t _bytes = 0;
+    std::uint64_t _sentences = 0;
+    PcapngWriter::Positions _positions = PcapngWriter::Positions::Without;
     std::vector<Move> _moves;
     std::optional<std::uint64_t> _messagesBeforeMove;
 };

@@ -47,6 +47,7 @@ public:
     [[nodiscard]] const std::vector<C2KPilot>& pilots() const { return _pilots; }
     /// All that is received on the carriers of that system.
     [[nodiscard]] double received_dBm(int sid) const;
+    [[nodiscard]] const RadioNetwork& radio() const { return _network; }
 
 private:
     void measure();

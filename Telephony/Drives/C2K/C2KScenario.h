@@ -52,6 +52,7 @@ private:
     void powerOff();
 
     void drive(double seconds) override;
+    [[nodiscard]] const RadioNetwork& road() const override { return _network.radio(); }
     void react() override;
     void addReports(DriveScript& due) override;
     void countUntil(double at) override { _context.transferUntil(at); }

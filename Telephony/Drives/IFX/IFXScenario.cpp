@@ -65,6 +65,10 @@ ScenarioEvent IFXScenario::next() {
     return {std::chrono::seconds(number), serialized(ifxDisplay(_phone, _network), number % 2 == 0)};
 }
 
+RoadPlace IFXScenario::place() const {
+    return {std::chrono::seconds(std::max(_seconds - 1, 0)), _network.east_m(), _network.north_m()};
+}
+
 void IFXScenario::tellTruth(TruthSink& sink) {
     _truth = std::make_unique<IFXTruth>(_phone, sink);
 }

@@ -35,6 +35,7 @@ public:
 
     [[nodiscard]] std::string_view technology() const override;
     [[nodiscard]] ScenarioEvent next() override;
+    [[nodiscard]] RoadPlace place() const override;
     void setIdentities(const DriveIdentities& identities) override { _phone.identities = identities; }
     void tellTruth(TruthSink& sink) override;
     void finishTruth() override;

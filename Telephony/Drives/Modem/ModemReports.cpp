@@ -6,6 +6,7 @@
 #include "Telephony/Drives/DriveScenario.h"
 #include "Telephony/Drives/Modem/ModemCellReports.h"
 #include "Telephony/Drives/Modem/ModemMessage.h"
+#include "Telephony/Drives/Road/RoadPlace.h"
 
 #include <chrono>
 #include <cstdio>
@@ -32,9 +33,6 @@ const char* codeOf(const PLMN& plmn) {
 const char* nameOf(const PLMN& plmn) {
     return plmn.mnc == 1 ? "Test Network" : "Other Test Network";
 }
-
-constexpr double ringCentreLatitude = 0.005; ///< in the sea: the ring reaches over the equator
-constexpr double metresInDegree = 111'320;   ///< along the equator, and the meridians near it
 
 } // namespace
 
@@ -77,8 +75,8 @@ std::optional<RecordBuilder> position(ModemReportContext& context) {
     const DictionaryRef account = modemAccount(context.phone);
     if (context.phone.isPresent() && context.phone.state >= MM::State::Searching) {
         const RadioNetwork& radio = context.network.radio();
-        account->set(kVoxPositionLatitude, ringCentreLatitude + radio.north_m() / metresInDegree);
-        account->set(kVoxPositionLongitude, radio.east_m() / metresInDegree);
+        account->set(kVoxPositionLatitude, latitudeOf(radio.north_m()));
+        account->set(kVoxPositionLongitude, longitudeOf(radio.east_m()));
         account->set(kVoxPositionAltitude, 12.5);
         using namespace std::chrono;
         const auto now =

@@ -62,6 +62,7 @@ private:
     void stopAnswering();
 
     void drive(double seconds) override;
+    [[nodiscard]] const RadioNetwork& road() const override { return _network.radio(); }
     void react() override;
     void addReports(DriveScript& due) override;
     void countUntil(double at) override;

@@ -37,6 +37,7 @@ public:
     /// What the phone's receiver would measure now, the best first; only cells above its sensitivity.
     [[nodiscard]] const std::vector<UTRANMeasurement>& cells() const { return _cells; }
     [[nodiscard]] const std::vector<GSMMeasurement>& gsm() const { return _network.gsm(); }
+    [[nodiscard]] const RadioNetwork& radio() const { return _network; }
 
 private:
     void measure();

@@ -51,6 +51,7 @@ private:
     void powerOff();
 
     void drive(double seconds) override;
+    [[nodiscard]] const RadioNetwork& road() const override { return _network.radio(); }
     void react() override;
     void addReports(DriveScript& due) override;
     [[nodiscard]] UnusualMessageParts unusualMessageParts(std::size_t number) override;

@@ -3,6 +3,7 @@
 
 #include "Tools/Decode/Samples/SampleLines.h"
 
+#include "Tools/Decode/Samples/PositionCells.h"
 #include "Tools/Decode/Samples/SampleText.h"
 #include "Tools/Text/JSONText.h"
 
@@ -43,6 +44,8 @@ void SampleLines::begin(const ObservedMessage& message) {
         _tail.append("null");
     _tail.append(",\"record\":");
     appendNumber(_tail, record());
+    if (hasPositions())
+        appendPositionMembers(_tail, position());
     _tail.append("}\n");
 }
 

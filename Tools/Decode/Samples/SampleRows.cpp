@@ -3,6 +3,7 @@
 
 #include "Tools/Decode/Samples/SampleRows.h"
 
+#include "Tools/Decode/Samples/PositionCells.h"
 #include "Tools/Decode/Samples/SampleText.h"
 #include "Tools/Text/CSVText.h"
 
@@ -14,7 +15,7 @@ SampleRows::SampleRows(Output& output, bool isLive, const DecodeOptions& options
 
 std::string SampleRows::header(const DecodeOptions& options) {
     return csvBeginning(options) + ",modem_time,path,row,value,unit,text,code,record" +
-           std::string(csvRowEnd);
+           std::string(options.hasPositions ? positionColumns : "") + std::string(csvRowEnd);
 }
 
 std::string SampleRows::textOf(const Decoded& decoded) const {
@@ -34,6 +35,8 @@ void SampleRows::begin(const ObservedMessage& message) {
     appendLogCode(_tail, message.code);
     _tail.append(',');
     appendNumber(_tail, record());
+    if (hasPositions())
+        appendPositionCells(_tail, position());
     _tail.append(csvRowEnd);
 }
 

@@ -3,6 +3,7 @@
 
 #pragma once
 
+#include "Export/Tracks/PositionedReader.h"
 #include "LogGenerator/Observations/Observation.h"
 #include "Tools/Decode/Samples/LeafTexts.h"
 #include "Tools/Decode/Samples/SelectedLeaves.h"
@@ -23,6 +24,7 @@ namespace velmora {
 /// messages.
 class SampleWriter : public LineWriter, private ObservationSink {
 public:
+    void setPositions(const PositionedReader& positions) override { _positions = &positions; }
     void didMakeDecoder(LogGenerator& decoder) override;
     void willConcern(const Decoded& decoded) override;
     void willDecode(const LoggedMessage& message) override;
@@ -53,6 +55,9 @@ protected:
     /// That of the message.
     [[nodiscard]] Technology& technology() { return *_technology; }
     [[nodiscard]] std::uint64_t record() const { return _record; }
+    /// Whether there are columns for positions, and the position of the message.
+    [[nodiscard]] bool hasPositions() const { return _positions != nullptr; }
+    [[nodiscard]] const std::optional<Position>& position() const { return _positions->position(); }
     /// The message's own time stamp as a time; absent where it has none or an invalid one.
     [[nodiscard]] static std::optional<Time> modemTime(const ObservedMessage& message);
 
@@ -63,6 +68,7 @@ private:
     }
 
     const DecodeOptions& _options;
+    const PositionedReader* _positions = nullptr; ///< null where they are not asked for
     LeafTexts::Form _form;
     std::map<std::string, Technology, std::less<>> _technologies; ///< by their short names
     Technology* _technology = nullptr;

@@ -3,6 +3,7 @@
 
 #include "Tools/Decode/Samples/WideRows.h"
 
+#include "Tools/Decode/Samples/PositionCells.h"
 #include "Tools/Decode/Samples/SampleText.h"
 #include "Tools/Output.h"
 #include "Tools/Text/CSVText.h"
@@ -30,6 +31,8 @@ std::string WideRows::header(const DecodeOptions& options, const SampleColumns& 
     TextBuffer row;
     row.append(csvBeginning(options));
     row.append(",modem_time,code,record");
+    if (options.hasPositions)
+        row.append(positionColumns);
     if (columns.hasRows())
         row.append(",row");
     for (const SampleColumns::Column& column : columns.columns()) {
@@ -92,6 +95,8 @@ void WideRows::writeRow(const ObservedMessage& message, const Observation& first
     appendLogCode(line(), message.code);
     line().append(',');
     appendNumber(line(), record());
+    if (hasPositions())
+        appendPositionCells(line(), position());
     if (_columns.hasRows()) {
         line().append(',');
         if (!first.rowKey.empty())
