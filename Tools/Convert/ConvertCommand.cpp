@@ -4,6 +4,7 @@
 #include "Tools/Convert/ConvertCommand.h"
 
 #include "Platform/Linux/Files/AtomicFile.h"
+#include "Recorder/OverwriteTarget.h"
 #include "Recording/OpenMessages.h"
 #include "Tools/Convert/Conversion.h"
 #include "Tools/Decode/Decoding.h"
@@ -11,7 +12,6 @@
 #include "Tools/ExitStatus.h"
 #include "Tools/Messages/TechnologyChoice.h"
 #include "Tools/OutputGuard.h"
-#include "Tools/OverwriteTarget.h"
 #include "Tools/Report.h"
 
 #include <filesystem>

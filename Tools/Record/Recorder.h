@@ -3,11 +3,11 @@
 
 #pragma once
 
+#include "Recorder/RecordingSession.h"
 #include "Tools/Log/ServiceLog.h"
 #include "Tools/Record/RecordOptions.h"
 #include "Tools/Record/RecordingModel.h"
 #include "Tools/Record/RecordingNews.h"
-#include "Tools/Record/RecordingSession.h"
 #include "Tools/ServiceClient.h"
 
 #include <memory>

@@ -1,13 +1,13 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Tools/Record/RecordingSession.h"
+#include "Recorder/RecordingSession.h"
 
 #include "Platform/Linux/Errno.h"
 #include "Platform/Linux/Files/AtomicFile.h"
 #include "Platform/TelephonyService.h"
+#include "Recorder/OverwriteTarget.h"
 #include "Recording/Files/DescriptorFile.h"
-#include "Tools/OverwriteTarget.h"
 
 #include <filesystem>
 #include <utility>

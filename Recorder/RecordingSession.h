@@ -5,8 +5,8 @@
 
 #include "Platform/Clock.h"
 #include "Platform/Result.h"
+#include "Recorder/RecordingFile.h"
 #include "Recording/Pcapng/PcapngWriter.h"
-#include "Tools/Record/RecordingFile.h"
 
 #include <cstdint>
 #include <memory>
