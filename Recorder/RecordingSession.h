@@ -8,6 +8,7 @@
 #include "Recorder/RecordingFile.h"
 #include "Recording/Pcapng/PcapngWriter.h"
 
+#include <cstddef>
 #include <cstdint>
 #include <memory>
 #include <optional>
@@ -40,6 +41,12 @@ public:
     /// A message has arrived. A failure ends the recording; a temporary error is not a failure (see
     /// `temporaryError`). Precondition: the technology is known.
     Result<Done> append(Time time, Bytes message);
+    /// A text of the user's about this moment, which goes into the file as a comment on the next message; cut
+    /// to `longestNote` bytes.
+    void note(std::string text);
+    /// Notes that no message has followed yet.
+    [[nodiscard]] std::size_t waitingNotes() const { return _notes.size(); }
+    static constexpr std::size_t longestNote = 1000;
     /// Writes the buffer to the file and starts its sync to storage; does nothing before the technology is
     /// known but to notice that others have changed the file. Retries after a temporary error. A failure is
     /// as above.
@@ -99,6 +106,7 @@ private:
     std::string _technology;
     std::string _temporaryError;
     std::uint64_t _bytes = 0;
+    std::vector<std::string> _notes; ///< for the next message
     std::vector<Move> _moves;
     std::optional<std::uint64_t> _messagesBeforeMove;
 };

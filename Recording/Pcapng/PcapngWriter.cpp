@@ -69,13 +69,13 @@ PcapngWriter::~PcapngWriter() {
     static_cast<void>(closed); // callers that need the result call close themselves
 }
 
-Result<Done> PcapngWriter::append(Time time, Bytes message) {
+Result<Done> PcapngWriter::append(Time time, Bytes message, std::span<const std::string> comments) {
     if (_permanentError)
         return *_permanentError;
     if (message.size() > maximumMessageSize)
         return Failure{"message of " + std::to_string(message.size()) + " bytes, wanted at most " +
                        std::to_string(maximumMessageSize)};
-    const std::size_t length = pcapngBlocks::packetSize(message.size());
+    const std::size_t length = pcapngBlocks::packetSize(message.size(), comments);
     // What has been gathered goes out ahead of a long message, so that the buffer need not hold both.
     if (!_temporaryError && !waiting().empty() && waiting().size() + length > 2 * flushThreshold) {
         if (Result<Done> written = flush(); !written && !_temporaryError)
@@ -86,7 +86,7 @@ Result<Done> PcapngWriter::append(Time time, Bytes message) {
         ++_dropped;
         return *_temporaryError;
     }
-    pcapngBlocks::appendPacket(_buffer, time, message);
+    pcapngBlocks::appendPacket(_buffer, time, message, 0, comments);
     ++_messages;
     return _temporaryError || waiting().size() < flushThreshold ? outcome() : flush();
 }

@@ -13,6 +13,7 @@
 #include <cstdint>
 #include <memory>
 #include <optional>
+#include <span>
 #include <string>
 #include <string_view>
 #include <vector>
@@ -57,8 +58,9 @@ public:
     PcapngWriter& operator=(const PcapngWriter&) = delete;
 
     /// Adds a message as it arrived. A time before 1970 cannot be recorded and becomes 1970-01-01. A message
-    /// above 16 MiB is refused, which does not end the recording. Precondition: it has not been closed.
-    Result<Done> append(Time time, Bytes message);
+    /// above 16 MiB is refused, which does not end the recording. `comments`: texts about it, of at most
+    /// 65535 bytes each. Precondition: it has not been closed.
+    Result<Done> append(Time time, Bytes message, std::span<const std::string> comments = {});
     /// Writes all messages so far to the file.
     Result<Done> flush();
     /// Flushes, and starts to sync the file in the background: a later call returns the result.
