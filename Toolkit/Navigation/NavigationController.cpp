@@ -46,6 +46,7 @@ std::unique_ptr<View> NavigationController::loadView() {
     });
     stack->setToolbarHidden(_isToolbarHidden);
     stack->setNotice(_notice);
+    stack->setAccessories(_accessories);
     return stack;
 }
 
@@ -91,6 +92,12 @@ void NavigationController::setNotice(Notice notice) {
     _notice = std::move(notice);
     if (isViewLoaded())
         stackView().setNotice(_notice);
+}
+
+void NavigationController::setAccessories(std::vector<View*> views) {
+    _accessories = std::move(views);
+    if (isViewLoaded())
+        stackView().setAccessories(_accessories);
 }
 
 void NavigationController::showTop(const std::shared_ptr<ViewController>& old, bool isPush, bool animated) {

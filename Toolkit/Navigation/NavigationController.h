@@ -50,6 +50,8 @@ public:
     /// What the bar between header and pane says, on whatever pane; none at first.
     void setNotice(Notice notice);
     [[nodiscard]] const Notice& notice() const { return _notice; }
+    /// Views between pane and toolbar, on whatever pane, the first on top; none at first. Not owned.
+    void setAccessories(std::vector<View*> views);
 
     void viewWillAppear(bool animated) override;
     void viewDidAppear(bool animated) override;
@@ -78,6 +80,7 @@ private:
     std::vector<std::shared_ptr<ViewController>> _panes;
     NavigationControllerDelegate* _delegate = nullptr;
     Notice _notice;
+    std::vector<View*> _accessories;
     bool _isToolbarHidden = true;
     bool _isOnScreen = false;
 };
