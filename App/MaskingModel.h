@@ -5,6 +5,9 @@
 
 #include "Model/VelmoraModel.h"
 
+#include <functional>
+#include <utility>
+
 namespace velmora {
 
 class PrivacySwitch;
@@ -17,10 +20,13 @@ public:
         : VelmoraModel(platform, observer), _clock(platform.clock), _privacy(privacy) {}
 
     void updateWithData(const Data& data) override;
+    /// Gets each message as it is shown, before it is decoded.
+    void setOnShown(std::function<void(const Data& message)> onShown) { _onShown = std::move(onShown); }
 
 private:
     const Clock& _clock;
     PrivacySwitch& _privacy;
+    std::function<void(const Data& message)> _onShown;
 };
 
 } // namespace velmora

@@ -23,6 +23,8 @@
 namespace velmora {
 
 class NavigationController;
+class PlaybackController;
+class RecordingSwitch;
 class VelmoraPaneController;
 class VelmoraSaveViewController;
 class Window;
@@ -63,6 +65,21 @@ public:
 
     /// The key of masked identities; a random one by default. Set before the application runs.
     void setMaskKey(const MaskKey& key) { _maskKey = key; }
+    /// Set before the application runs: it shows this recording instead of connecting to a service.
+    void setRecording(std::string path, std::string technology) {
+        _recordingPath = std::move(path);
+        _recordingTechnology = std::move(technology);
+    }
+    /// Shows a recording on the panes, in place of what is received or of another one; see
+    /// PlaybackController::open. A failure says so on the screen and changes nothing.
+    void openRecording(const std::string& path, const std::string& technology = {});
+    /// Shows what is received again.
+    void closeRecording();
+    /// What records what is received. Precondition: the application has launched.
+    [[nodiscard]] RecordingSwitch& recording() const { return *_recording; }
+    /// The recording that is shown; null for what is received.
+    [[nodiscard]] PlaybackController* playback() const { return _playback.get(); }
+
     /// Masks identities, or shows them again: on the panes, on the save screen and in what that writes.
     /// The panes begin empty, with a new connection, so that nothing decoded before is shown.
     void togglePrivacy();
@@ -115,8 +132,15 @@ private:
         std::string updateMessage;
     };
 
+    void start();
     void connectFirst();
     void clearPanes();
+    /// Has the panes show the display as it is now.
+    void redraw();
+    void showMoment();
+    /// Puts the bars of recordings that are played and made below the panes.
+    void showBars();
+    void makeRecordingSwitch();
     /// What the bar above the panes says: that identities are masked, and the connection's problem or that
     /// the panes do not show what is received.
     void updateNotice();
@@ -131,6 +155,10 @@ private:
     std::unique_ptr<PrivacySwitch> _privacy; ///< the model refers to it
     std::shared_ptr<VelmoraModel> _model;
     [[maybe_unused]] bool _allowSaveButton = false; ///< unused: the property has the flag
+    std::string _recordingPath;
+    std::string _recordingTechnology;
+    std::unique_ptr<PlaybackController> _playback;
+    std::unique_ptr<RecordingSwitch> _recording;
     std::unique_ptr<DateFormatter> _dateFormatter;
     [[maybe_unused]] std::string _updateMessage; ///< unused: the property has the text
     Properties _properties;
