@@ -7,6 +7,8 @@
 #include "App/Playback/MomentText.h"
 #include "App/Playback/PlaybackNotice.h"
 #include "App/Playback/PlaybackSpeeds.h"
+#include "App/Playback/TimedSteps.h"
+#include "Platform/PrintableText.h"
 #include "Platform/TelephonyService.h"
 
 #include <algorithm>
@@ -23,20 +25,8 @@ using namespace std::chrono_literals;
 
 constexpr auto playInterval = 50ms;
 constexpr auto readInterval = 2ms;
-/// How long a step of playing or reading may take, so that input is not kept waiting.
-constexpr auto stepTime = 8ms;
 /// Between two looks at the time.
 constexpr std::uint64_t messagesAtOnce = 200;
-
-/// Calls `step` until it returns true or the time for it is over. Whether it has returned true.
-template <class Step>
-bool inTime(Step step) {
-    const auto end = std::chrono::steady_clock::now() + stepTime;
-    while (!step())
-        if (std::chrono::steady_clock::now() >= end)
-            return false;
-    return true;
-}
 
 } // namespace
 
@@ -97,11 +87,12 @@ Result<Done> PlaybackController::load() {
         return Failure{player.reason()};
     // What refers to another goes first.
     _player = *std::move(player);
+    _events.reset();
     _index = *std::move(index);
+    _events.emplace(_index->decoder().decoder());
     _file = *std::move(file);
     _technology = _index->technology();
-    _nodes.reset();
-    _nodesByPath.reset();
+    _tree.clear();
     _reading = _platform.queue.repeating(readInterval, [this] { readOn(); });
     showBar();
     return Done{};
@@ -126,6 +117,7 @@ void PlaybackController::readOn() {
     }
     if (_index->isComplete()) {
         _reading.reset();
+        _events->finish();
         _host.noticeChanged();
     }
     showBar();
@@ -163,18 +155,18 @@ void PlaybackController::playOn() {
         return;
     }
     checkFile();
-    _nodes.reset();
-    _nodesByPath.reset();
+    _tree.clear();
     showBar();
     _host.displayChanged();
 }
 
 void PlaybackController::moved() {
+    if (!std::exchange(_event, {}).empty())
+        _host.noticeChanged();
     _playedFrom = shownTime();
     _playedSince = _platform.clock.now();
     checkFile();
-    _nodes.reset();
-    _nodesByPath.reset();
+    _tree.clear();
     showBar();
     _host.displayChanged();
 }
@@ -213,8 +205,22 @@ void PlaybackController::run(PlaybackBar::Command command) {
         _player->stepToNextRefresh();
         moved();
         break;
-    default: break;
+    case Command::EarlierEvent: seekToEvent(_events->before(shownTime())); break;
+    case Command::NextEvent:
+        // At the front, those at the time of the first message are still to come.
+        seekToEvent(_events->after(position == 0 ? shownTime() - 1ns : shownTime()));
+        break;
+    case Command::PlayOrPause: break;
     }
+}
+
+void PlaybackController::seekToEvent(const PlaybackEvents::Found* event) {
+    if (!event)
+        return;
+    // After the messages of that time.
+    seekToTime(event->time + std::chrono::nanoseconds(1));
+    _event = event->text;
+    _host.noticeChanged();
 }
 
 void PlaybackController::setSpeed(std::size_t index) {
@@ -248,22 +254,11 @@ void PlaybackController::checkFile() {
 }
 
 NodeRef PlaybackController::topLevelNodes() {
-    if (_nodes)
-        return _nodes;
-    const Value display = _player->display();
-    if (display.isNone())
-        return nullptr;
-    PathDictionary paths;
-    _nodes = VelmoraModelNode::makeTreeFromObject(display, paths);
-    _nodesByPath = std::move(paths);
-    return _nodes;
+    return _tree.root([this] { return _player->display(); });
 }
 
 NodeRef PlaybackController::nodeAtPath(const std::string& path) {
-    if (!topLevelNodes() || !_nodesByPath)
-        return nullptr;
-    const auto found = _nodesByPath->find(path);
-    return found == _nodesByPath->end() ? nullptr : found->second;
+    return topLevelNodes() ? _tree.at(path) : nullptr;
 }
 
 std::string PlaybackController::progress() const {
@@ -275,6 +270,8 @@ std::string PlaybackController::progress() const {
 Notice PlaybackController::notice() {
     const std::string other = otherTechnology(*_file, *_index);
     Notice notice{playbackNotice(*_file, *_index, *_player, _change), {}, {}};
+    if (!_event.empty())
+        notice.text += (notice.text.empty() ? "" : " ") + printable(_event);
     if (!other.empty()) {
         notice.title = "Show " + technologyTitle(other);
         notice.action = [this] { showOtherTechnology(); };

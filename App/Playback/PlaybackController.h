@@ -3,8 +3,10 @@
 
 #pragma once
 
+#include "App/Playback/MomentTree.h"
 #include "Model/VelmoraModel.h"
 #include "Model/VelmoraModelNode.h"
+#include "Playback/PlaybackEvents.h"
 #include "Playback/Player.h"
 #include "Toolkit/Bars/PlaybackBar.h"
 #include "Toolkit/Notice.h"
@@ -67,6 +69,8 @@ private:
     void readOn();
     void playOn();
     void run(PlaybackBar::Command command);
+    /// Null for none.
+    void seekToEvent(const PlaybackEvents::Found* event);
     void setSpeed(std::size_t index);
     /// The moment has changed by a move of the user's, or playing begins from it.
     void moved();
@@ -82,6 +86,7 @@ private:
     PlaybackBar _bar;
     std::unique_ptr<PlayedFile> _file;
     std::unique_ptr<RecordingIndex> _index;
+    std::optional<PlaybackEvents> _events; ///< of the index's decoder
     std::unique_ptr<Player> _player;
     std::unique_ptr<Timer> _reading; ///< while the index is not complete
     std::unique_ptr<Timer> _playing; ///< while it plays
@@ -90,9 +95,8 @@ private:
     Time _playedSince{};                  ///< ... at this time of the platform's clock
     std::optional<std::uint64_t> _wanted; ///< where to go once the index has read that far
     std::string _change;                  ///< of the file since it was opened
-    /// The tree of the moment, made when it is asked for.
-    NodeRef _nodes;
-    std::optional<PathDictionary> _nodesByPath;
+    std::string _event;                   ///< that the moment was chosen by
+    MomentTree _tree;
 };
 
 } // namespace velmora

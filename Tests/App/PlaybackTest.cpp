@@ -89,6 +89,25 @@ TEST_F(PlaybackScreenTest, KeysStepByMessageAndByRefreshBothWays) {
     EXPECT_EQ(shown, "ABACDEDCB");
 }
 
+TEST_F(PlaybackScreenTest, BracketsGoToEvents) {
+    // Two silences of more than 30 s.
+    openPaused(
+        write("a.pcapng", {{0, band("A")}, {40'000, band("B")}, {41'000, band("C")}, {99'000, band("D")}}));
+    press(Qt::Key_BracketRight);
+    EXPECT_EQ(shownBand(), "A");
+    EXPECT_EQ(shownNotice(), "gap: no message for 40.000 s");
+    press(Qt::Key_BracketRight);
+    EXPECT_EQ(shownBand(), "C");
+    EXPECT_EQ(shownNotice(), "gap: no message for 58.000 s");
+    press(Qt::Key_BracketRight);
+    EXPECT_EQ(shownBand(), "C") << "there is none after it";
+    press(Qt::Key_BracketLeft);
+    EXPECT_EQ(shownBand(), "A");
+    EXPECT_EQ(shownNotice(), "gap: no message for 40.000 s");
+    press(Qt::Key_Period);
+    EXPECT_EQ(shownNotice(), "");
+}
+
 TEST_F(PlaybackScreenTest, SpeedMultipliesTime) {
     openPaused(write("a.pcapng", {{0, band("A")}, {50'000, band("B")}, {99'000, band("C")}}));
     auto* const speed = qobject_cast<QToolButton*>(part("velmora.playback.speed"));
