@@ -23,8 +23,12 @@ void MaskingModel::decoderWillChange(LogGenerator* next) {
 }
 
 void MaskingModel::updateWithData(const Data& data) {
-    if (const std::optional<Data> shown = _privacy.shown(data, technology(), _clock.now()))
-        VelmoraModel::updateWithData(*shown);
+    const std::optional<Data> shown = _privacy.shown(data, technology(), _clock.now());
+    if (!shown)
+        return;
+    if (_onShown)
+        _onShown(*shown);
+    VelmoraModel::updateWithData(*shown);
 }
 
 } // namespace velmora

@@ -5,6 +5,9 @@
 
 #include "Model/VelmoraModel.h"
 
+#include <functional>
+#include <utility>
+
 namespace velmora {
 
 class DriveModel;
@@ -23,6 +26,8 @@ public:
     void setDrive(DriveModel* drive);
 
     void updateWithData(const Data& data) override;
+    /// Gets each message as it is shown, before it is decoded.
+    void setOnShown(std::function<void(const Data& message)> onShown) { _onShown = std::move(onShown); }
 
 protected:
     void decoderWillChange(LogGenerator* next) override;
@@ -32,6 +37,7 @@ private:
     DriveModel* _drive = nullptr;
     const Clock& _clock;
     PrivacySwitch& _privacy;
+    std::function<void(const Data& message)> _onShown;
 };
 
 } // namespace velmora

@@ -5,10 +5,13 @@
 
 #include "App/DriveView/DriveScreen.h"
 #include "App/MaskingModel.h"
+#include "App/Playback/PlaybackController.h"
+#include "App/Recording/RecordingSwitch.h"
 #include "App/VelmoraPaneController.h"
 #include "App/VelmoraSaveViewController.h"
 #include "Model/NodePath.h"
 #include "Platform/SystemLog.h"
+#include "Toolkit/Alert.h"
 #include "Toolkit/Navigation/NavigationController.h"
 #include "Toolkit/Navigation/SplitController.h"
 #include "Toolkit/Screen.h"
@@ -30,6 +33,9 @@ constexpr const char* connecting = "Connecting...";
 constexpr char privacyKey = 'M';
 constexpr char driveKey = 'D';
 constexpr char pinKey = 'P';
+constexpr char closeKey = 'W';
+constexpr char recordKey = 'R';
+constexpr char noteKey = 'B';
 constexpr const char* maskedNotice = "Identities are masked. Ctrl-M shows them.";
 
 } // namespace
@@ -41,6 +47,8 @@ VelmoraApp::VelmoraApp(int& argc, char** argv, const PlatformMaker& makePlatform
 
 VelmoraApp::~VelmoraApp() {
     // A retry that is due holds the model beyond this; the ports do not stay open for it.
+    if (_navController)
+        _navController->setAccessories({});
     if (!_model)
         return;
     _model->destroyPorts();
@@ -51,7 +59,7 @@ void VelmoraApp::applicationDidFinishLaunching(Application&) {
     getSaveButtonPref();
     _window = std::make_shared<Window>(Screen::mainBounds());
     _privacy = std::make_unique<PrivacySwitch>(_platform->preferences(), _maskKey);
-    _model = std::make_shared<MaskingModel>(_platform->model(), this, *_privacy);
+    makeRecordingSwitch();
     _drive = std::make_unique<DriveScreen>(*_platform, [this] { return _model && _model->isConnected(); });
     _model->setDrive(&_drive->model());
     setUpdateMessage(connecting);
@@ -67,11 +75,23 @@ void VelmoraApp::applicationDidFinishLaunching(Application&) {
     _window->setCommand(privacyKey, [this] { togglePrivacy(); });
     _window->setCommand(driveKey, [this] { _drive->toggle(); });
     _window->setCommand(pinKey, [this] { pinFocusRow(); });
+    _window->setCommand(closeKey, [this] { closeRecording(); });
+    _window->setCommand(recordKey,
+                        [this] { _recording->toggle(_model->technology(), _model->isConnected()); });
+    _window->setCommand(noteKey, [this] { _recording->askNote(); });
+    _window->setOnDrop([this](const std::string& path) { openRecording(path); });
     updateNotice();
     _window->makeKeyAndVisible();
     // The screen is up before the first exchange with the telephony service, which blocks. The display's
     // server exposes a new window when it gets to it, which may be long after this task.
-    _platform->model().queue.async([this] { _window->whenPainted([this] { connectFirst(); }); });
+    _platform->model().queue.async([this] { _window->whenPainted([this] { start(); }); });
+}
+
+void VelmoraApp::start() {
+    if (_recordingPath.empty())
+        connectFirst();
+    else
+        openRecording(_recordingPath, _recordingTechnology);
 }
 
 void VelmoraApp::connectFirst() {
@@ -92,6 +112,9 @@ void VelmoraApp::applicationWillTerminate() {
     setSaveViewController(nullptr);
     if (_window)
         _window->setHidden(true);
+    _recording->stop();
+    _navController->setAccessories({});
+    _playback.reset();
     setWindow(nullptr);
     _model->setDrive(nullptr);
     _model.reset();
@@ -115,7 +138,14 @@ void VelmoraApp::_setGSMRSSI(bool isShown) {
 void VelmoraApp::showSaveView() {
     if (_saveViewController)
         return;
-    _saveViewController = std::make_shared<VelmoraSaveViewController>(_model->getSaveContents(), *this);
+    if (_playback) {
+        _playback->pause();
+        const Player::Saved saved = _playback->saved();
+        _saveViewController =
+            std::make_shared<VelmoraSaveViewController>(saved.contents, *this, saved.refresh);
+    } else {
+        _saveViewController = std::make_shared<VelmoraSaveViewController>(_model->getSaveContents(), *this);
+    }
     _navController->presentModalViewController(_saveViewController, true);
 }
 
@@ -148,13 +178,21 @@ void VelmoraApp::togglePrivacy() {
     if (!_model) // shut down
         return;
     _privacy->setOn(!_privacy->isOn());
+    // A recording holds identities or pseudonyms, never both.
+    _recording->stop("identities are masked otherwise now");
     // What was decoded so far is in the decoder, the tree, the panes and the save screen's copy.
     _endsOnceSaved = false;
     closeSaveView();
-    _model->forget();
+    if (_recordingPath.empty())
+        _model->forget();
     _drive->forget();
     clearPanes();
+    if (_playback)
+        if (const auto done = _playback->reopen(); !done)
+            Alert("Recording", done.reason(), "Close").show();
     updateNotice();
+    if (!_recordingPath.empty())
+        return;
     _window->displayIfNeeded(); // the connection may block for seconds
     _platform->model().queue.async([model = _model] { model->restartMonitor(); });
 }
@@ -174,32 +212,43 @@ void VelmoraApp::clearPanes() {
 }
 
 void VelmoraApp::updateStatusForViewController(VelmoraPaneController& pane) {
-    if (_model->isConnected())
+    if (_playback || _model->isConnected())
         pane.setStatus(updateMessage(), false);
     else
         pane.setStatus(connecting, true);
 }
 
 void VelmoraApp::updateViewControllerFromModel() {
+    if (_playback)
+        return; // what is received is not shown
+    if (_model->isConnected())
+        setUpdateMessage(_dateFormatter->stringFromDate(_platform->model().clock.now()));
+    redraw();
+    updateNotice();
+}
+
+void VelmoraApp::redraw() {
     // Only panes are ever put on the stack. Popping changes it, so the loop runs over a copy.
     const std::vector<std::shared_ptr<ViewController>> panes = _navController->viewControllers();
     for (std::size_t i = 0; i < panes.size(); ++i) {
         auto& pane = static_cast<VelmoraPaneController&>(*panes[i]);
-        NodeRef node = i == 0 ? _model->topLevelNodes() : _model->nodeAtPath(pane.path());
+        NodeRef node = i == 0      ? (_playback ? _playback->topLevelNodes() : _model->topLevelNodes())
+                       : _playback ? _playback->nodeAtPath(pane.path())
+                                   : _model->nodeAtPath(pane.path());
         if (i > 0 && !node) {
             _navController->popToViewController(*panes[i - 1], true);
             break;
         }
         pane.reloadWithNode(std::move(node));
     }
-    if (_model->isConnected())
-        setUpdateMessage(_dateFormatter->stringFromDate(_platform->model().clock.now()));
     updateStatusForViewController(static_cast<VelmoraPaneController&>(*_navController->topViewController()));
-    updateNotice();
 }
 
 void VelmoraApp::connectionChanged() {
     if (!_model) // shut down, while a retry that is due keeps the model
+        return;
+    _recording->connectionChanged(_model->technology(), _model->isConnected());
+    if (_playback)
         return;
     updateStatusForViewController(static_cast<VelmoraPaneController&>(*_navController->topViewController()));
     updateNotice();
@@ -215,7 +264,9 @@ void VelmoraApp::connectionChanged() {
 }
 
 void VelmoraApp::updateNotice() {
-    Notice notice = connectionNotice();
+    Notice notice = _playback ? _playback->notice() : connectionNotice();
+    if (const std::string recorded = _recording->notice(); !recorded.empty())
+        notice.text = notice.text.empty() ? recorded : recorded + " " + notice.text;
     if (_privacy->isOn())
         notice.text = notice.text.empty() ? maskedNotice : maskedNotice + (" " + notice.text);
     _navController->setNotice(std::move(notice));

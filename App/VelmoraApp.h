@@ -25,6 +25,8 @@ namespace velmora {
 class DriveScreen;
 class MaskingModel;
 class NavigationController;
+class PlaybackController;
+class RecordingSwitch;
 class VelmoraPaneController;
 class VelmoraSaveViewController;
 class Window;
@@ -65,6 +67,21 @@ public:
 
     /// The key of masked identities; a random one by default. Set before the application runs.
     void setMaskKey(const MaskKey& key) { _maskKey = key; }
+    /// Set before the application runs: it shows this recording instead of connecting to a service.
+    void setRecording(std::string path, std::string technology) {
+        _recordingPath = std::move(path);
+        _recordingTechnology = std::move(technology);
+    }
+    /// Shows a recording on the panes, in place of what is received or of another one; see
+    /// PlaybackController::open. A failure says so on the screen and changes nothing.
+    void openRecording(const std::string& path, const std::string& technology = {});
+    /// Shows what is received again.
+    void closeRecording();
+    /// What records what is received. Precondition: the application has launched.
+    [[nodiscard]] RecordingSwitch& recording() const { return *_recording; }
+    /// The recording that is shown; null for what is received.
+    [[nodiscard]] PlaybackController* playback() const { return _playback.get(); }
+
     /// Masks identities, or shows them again: on the panes, on the save screen and in what that writes.
     /// The panes begin empty, with a new connection, so that nothing decoded before is shown.
     void togglePrivacy();
@@ -126,8 +143,15 @@ private:
         std::string updateMessage;
     };
 
+    void start();
     void connectFirst();
     void clearPanes();
+    /// Has the panes show the display as it is now.
+    void redraw();
+    void showMoment();
+    /// Puts the bars of recordings that are played and made below the panes.
+    void showBars();
+    void makeRecordingSwitch();
     /// What the bar above the panes says: that identities are masked, and the connection's problem or that
     /// the panes do not show what is received.
     void updateNotice();
@@ -143,6 +167,10 @@ private:
     std::unique_ptr<DriveScreen> _drive;     ///< so does it to this
     std::shared_ptr<MaskingModel> _model;
     [[maybe_unused]] bool _allowSaveButton = false; ///< unused: the property has the flag
+    std::string _recordingPath;
+    std::string _recordingTechnology;
+    std::unique_ptr<PlaybackController> _playback;
+    std::unique_ptr<RecordingSwitch> _recording;
     std::unique_ptr<DateFormatter> _dateFormatter;
     [[maybe_unused]] std::string _updateMessage; ///< unused: the property has the text
     Properties _properties;

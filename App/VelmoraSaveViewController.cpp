@@ -26,8 +26,9 @@ constexpr double cellFontSize = 13;
 
 } // namespace
 
-VelmoraSaveViewController::VelmoraSaveViewController(const ArrayRef& saveHistory, VelmoraApp& app)
-    : _timeStamp(app.platform().model().clock.now()),
+VelmoraSaveViewController::VelmoraSaveViewController(const ArrayRef& saveHistory, VelmoraApp& app,
+                                                     std::optional<Time> timeStamp)
+    : _timeStamp(timeStamp ? *timeStamp : app.platform().model().clock.now()),
       _saveHistory(saveHistory ? Value(saveHistory).copy().arrayRef() : nullptr), _seal(app.maskSeal()),
       _app(app) {}
 

@@ -29,8 +29,10 @@ class VelmoraSaveViewController final : public ViewController,
                                         public TableViewDataSource,
                                         public TableViewDelegate {
 public:
-    /// `saveHistory` may be null: the model has no decoder. `app` must outlive the screen.
-    VelmoraSaveViewController(const ArrayRef& saveHistory, VelmoraApp& app);
+    /// `saveHistory` may be null: the model has no decoder. `app` must outlive the screen. `timeStamp`: the
+    /// snapshot's, for a recording's moment; absent for now.
+    VelmoraSaveViewController(const ArrayRef& saveHistory, VelmoraApp& app,
+                              std::optional<Time> timeStamp = std::nullopt);
     ~VelmoraSaveViewController() override;
 
     [[nodiscard]] TableView& saveContentTable() { return _saveContentTable; }
@@ -64,7 +66,7 @@ private:
     [[nodiscard]] bool writeSnapshot(const std::string& path) const;
     void queueClosing();
 
-    /// When the screen was created, which is the snapshot's time, not that of saving.
+    /// When the screen was created, or the moment that it saves; not when it is saved.
     Time _timeStamp;
     ArrayRef _saveHistory;
     std::optional<MaskSeal> _seal; ///< of a snapshot of masked messages

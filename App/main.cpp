@@ -16,6 +16,8 @@
 #include "Platform/Linux/Termination.h"
 #include "Platform/PrintableText.h"
 #include "Platform/SystemLog.h"
+#include "Platform/TelephonyService.h"
+#include "Playback/PlayedFile.h"
 
 #include <CLI/CLI.hpp>
 
@@ -34,6 +36,7 @@ using namespace velmora;
 using namespace std::chrono_literals;
 
 constexpr int done = 0;
+constexpr int badInput = 1;
 constexpr int badUsage = 2;
 constexpr auto selfTestLimit = 60s;
 constexpr int cannotRestart = 1;
@@ -46,6 +49,8 @@ struct Options {
     bool startsService = false;
     bool beginsWithDrive = false;
     std::optional<MaskKey> maskKey;
+    std::string recording;
+    std::string technology;
 };
 
 Result<MaskKey> readMaskKey(const std::string& path) {
@@ -90,6 +95,13 @@ void declare(CLI::App& app, Options& options) {
     app.add_option("--log-level", options.logLevel, "The least urgent lines that are written, 0 to 7")
         ->check(CLI::Range(0, 7))
         ->capture_default_str();
+    app.add_option("FILE", options.recording, "A recording, a snapshot or a DLF log to show instead");
+    app.add_option("--technology", options.technology, "Which of the file's technologies to show")
+        ->type_name("NAME")
+        ->needs("FILE")
+        ->check([](const std::string& name) {
+            return isTechnology(name) ? std::string() : '"' + name + "\", wanted one of " + technologyNames();
+        });
     app.add_flag("--start-service", options.startsService,
                  "Start the telephony service first where none is running");
     app.add_option_function<std::string>(
@@ -105,7 +117,9 @@ void declare(CLI::App& app, Options& options) {
                "  velmora-telephonyd --source scenario:gsm,seed=1 &\n"
                "  velmora\n"
                "With the installed service, on what the modem reports:\n"
-               "  velmora --start-service");
+               "  velmora --start-service\n"
+               "A recording, which plays, pauses, steps and seeks; it can be dropped on the window, too:\n"
+               "  velmora drive.pcapng");
 }
 
 /// Absent where the application is to be started anew.
@@ -123,6 +137,8 @@ std::optional<int> show(const Options& options, char* program) {
     app.setBeginsWithDrive(options.beginsWithDrive);
     if (options.maskKey)
         app.setMaskKey(*options.maskKey);
+    if (!options.recording.empty())
+        app.setRecording(options.recording, options.technology);
     std::unique_ptr<SelfTest> selfTest;
     if (options.isSelfTest)
         selfTest = std::make_unique<SelfTest>(app, selfTestLimit);
@@ -147,6 +163,12 @@ int main(int argc, char** argv) {
         std::fputs(printableLines(words.str()).c_str(), stderr);
         return isDone ? done : badUsage;
     }
+    if (!options.recording.empty())
+        if (const auto file = PlayedFile::open(options.recording); !file) {
+            std::fputs(printableLines("velmora: " + options.recording + ": " + file.reason() + "\n").c_str(),
+                       stderr);
+            return badInput;
+        }
     if (const std::optional<int> status = show(options, argv[0]))
         return *status;
     // The display, the ports and the log are closed.

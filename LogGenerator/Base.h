@@ -74,6 +74,11 @@ public:
         _fieldMap = map;
     }
 
+    /// What the section needs of earlier records for later ones and has in no node; none for most sections.
+    [[nodiscard]] virtual Value memory() const { return {}; }
+    /// Continues with what another section of the kind had in memory.
+    virtual void setMemory(const Value& /*memory*/) {}
+
     /// Sets the section's node, a dictionary or an array.
     void updateSectionRef(const Value& node);
     /// The node with all that has arrived; none before the display is built and once it is gone.

@@ -44,6 +44,10 @@ public:
     /// records until the display is requested, so that "Display" in the state may lack the latest ones: read
     /// it through this function only.
     [[nodiscard]] virtual Value display(Dictionary& state);
+    /// What the decoder needs for later messages and has not in the state; none for most. With a state after
+    /// `display` and this, another decoder continues as this one would.
+    [[nodiscard]] virtual Value memory() const { return {}; }
+    virtual void setMemory(const Value& /*memory*/) {}
     /// The property-list dictionary that makes the telephony service stream this technology's messages.
     [[nodiscard]] virtual DictionaryRef getStartCommand() const = 0;
     /// What a snapshot saves: dictionaries that each hold a "Description" string.

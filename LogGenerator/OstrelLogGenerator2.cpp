@@ -126,7 +126,7 @@ std::optional<std::uint32_t> OstrelLogGenerator2::routeParsed(const Data& messag
 Value OstrelLogGenerator2::getDisplayFromState(Dictionary& state) {
     if (const Value& display = state["Display"]; !display.isNone()) {
         if (!_sectionsAttached)
-            attachSections(display);
+            attachSections(display, state["Template"]);
         _sectionsAttached = true;
         cIndex->writeNodes();
         return display;
@@ -150,18 +150,21 @@ Value OstrelLogGenerator2::getDisplayFromState(Dictionary& state) {
     return {}; // not the display: see the header
 }
 
-void OstrelLogGenerator2::attachSections(const Value& object) {
+void OstrelLogGenerator2::attachSections(const Value& display, const Value& shape) {
     // The state outlives decoders. After a reconnection this decoder's sections have no nodes yet while the
     // display of the earlier one is still shown: they continue in it, and nothing that it shows is lost.
-    if (const Dictionary* dictionary = object.asDictionary()) {
-        for (const auto& [key, value] : *dictionary) {
-            if (Base* section = cIndex->getClass(key))
-                section->updateSectionRef(value);
-            attachSections(value);
-        }
-    } else if (const Array* array = object.asArray()) {
-        for (const Value& element : *array)
-            attachSections(element);
+    const Dictionary* const nodes = display.asDictionary();
+    const Dictionary* const wanted = shape.asDictionary();
+    if (!nodes || !wanted)
+        return;
+    for (const auto& [key, value] : *nodes) {
+        // What a section shows may have the name of another section, as "SIM" in a list of SIM slots.
+        const Value* const below = wanted->find(key);
+        if (!below)
+            continue;
+        if (Base* section = cIndex->getClass(key))
+            section->updateSectionRef(value);
+        attachSections(value, *below);
     }
 }
 
@@ -282,6 +285,21 @@ Value OstrelLogGenerator2::generateLogUsingState(Dictionary& state) {
 Value OstrelLogGenerator2::display(Dictionary& state) {
     cIndex->writeNodes();
     return state["Display"];
+}
+
+Value OstrelLogGenerator2::memory() const {
+    const DictionaryRef all = makeDictionary();
+    for (const auto& [name, section] : cIndex->classDict)
+        if (Value memory = section->memory(); !memory.isNone())
+            all->set(name, std::move(memory));
+    return all->empty() ? Value() : Value(all);
+}
+
+void OstrelLogGenerator2::setMemory(const Value& memory) {
+    if (const Dictionary* const all = memory.asDictionary())
+        for (const auto& [name, value] : *all)
+            if (Base* const section = cIndex->getClass(name))
+                section->setMemory(value);
 }
 
 DictionaryRef OstrelLogGenerator2::getStartCommand() const {

@@ -35,6 +35,9 @@ public:
     void updateStateReporting(Dictionary& state, const Data& data, MessageEffects& effects) override;
     [[nodiscard]] Value generateLogUsingState(Dictionary& state) override;
     [[nodiscard]] Value display(Dictionary& state) override;
+    /// That of the sections, by name.
+    [[nodiscard]] Value memory() const override;
+    void setMemory(const Value& memory) override;
     [[nodiscard]] DictionaryRef getStartCommand() const override;
     [[nodiscard]] std::optional<Time> latestRecord(std::string_view section) const override;
 
@@ -73,8 +76,9 @@ private:
     /// Does what `updateWithData` does. Returns the code; none for a message that was dropped.
     std::optional<std::uint32_t> route(const Data& message);
     std::optional<std::uint32_t> routeParsed(const Data& message, const LogMessage& parsed);
-    /// Sets the nodes of this decoder's sections to those of a display that an earlier decoder built.
-    void attachSections(const Value& object);
+    /// Sets the nodes of this decoder's sections to those of a display that an earlier decoder built from the
+    /// template.
+    void attachSections(const Value& display, const Value& shape);
 
     std::string pListName;
     std::shared_ptr<ClassIndex> cIndex;

@@ -84,6 +84,7 @@ Window::~Window() {
     window.onSave = nullptr;
     window.onFocus = nullptr;
     window.onPainted = nullptr;
+    window.onDrop = nullptr;
     window.commands.clear();
     window.hide();
     if (_impl->root)
@@ -138,6 +139,12 @@ void Window::displayIfNeeded() {
 
 void Window::setCommand(char letter, std::function<void()> command) {
     _impl->widget().commands[letter] = std::move(command); // the number of a letter's key is its code
+}
+
+void Window::setOnDrop(std::function<void(const std::string& path)> dropped) {
+    WindowWidget& window = _impl->widget();
+    window.onDrop = std::move(dropped);
+    window.setAcceptDrops(window.onDrop != nullptr);
 }
 
 bool Window::isHidden() const {

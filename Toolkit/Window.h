@@ -7,6 +7,7 @@
 
 #include <functional>
 #include <memory>
+#include <string>
 
 class QWidget;
 
@@ -39,6 +40,9 @@ public:
     /// Calls `command` when Ctrl and the capital letter are pressed, on whatever screen, a modal one
     /// included.
     void setCommand(char letter, std::function<void()> command);
+    /// Calls `dropped` with the path of a file that is dropped on the window, on whatever screen. Several at
+    /// once, and what is no file of this machine, are refused.
+    void setOnDrop(std::function<void(const std::string& path)> dropped);
     [[nodiscard]] bool isHidden() const;
     /// Takes the window off the screen, or puts it back.
     void setHidden(bool isHidden);

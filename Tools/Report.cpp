@@ -3,6 +3,8 @@
 
 #include "Tools/Report.h"
 
+#include "Recorder/OverwriteTarget.h"
+
 #include "Platform/Linux/Termination.h"
 #include "Platform/PrintableText.h"
 #include "Tools/ExitStatus.h"
@@ -41,7 +43,7 @@ std::string fileTitle(const std::string& path) {
 }
 
 std::string fileExistsMessage(const std::string& path) {
-    return path + " is there already; --force overwrites it";
+    return existingFileMessage(path);
 }
 
 std::string positionInFile(std::string_view title, std::uint64_t number, std::uint64_t offset) {

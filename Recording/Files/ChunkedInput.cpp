@@ -15,9 +15,9 @@ namespace {
 constexpr std::size_t smallestRead = 4096;
 } // namespace
 
-ChunkedInput::ChunkedInput(std::unique_ptr<ByteSource> source, std::size_t chunkSize)
+ChunkedInput::ChunkedInput(std::unique_ptr<ByteSource> source, std::size_t chunkSize, std::uint64_t offset)
     : _source(std::move(source)), _chunkSize(std::max(chunkSize, 2 * smallestRead)),
-      _chunk(std::make_shared<std::vector<std::uint8_t>>()) {}
+      _chunk(std::make_shared<std::vector<std::uint8_t>>()), _offset(offset) {}
 
 bool ChunkedInput::fill(std::size_t count) {
     while (_end - _begin < count && !_ended) {

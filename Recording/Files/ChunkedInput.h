@@ -28,13 +28,15 @@ public:
     /// been read, is negligible growth; larger ones are not read faster.
     static constexpr std::size_t defaultChunkSize = std::size_t{256} << 10;
 
-    explicit ChunkedInput(std::unique_ptr<ByteSource> source, std::size_t chunkSize = defaultChunkSize);
+    /// `offset`: of the source's first byte in the input, where it does not begin at the front.
+    explicit ChunkedInput(std::unique_ptr<ByteSource> source, std::size_t chunkSize = defaultChunkSize,
+                          std::uint64_t offset = 0);
 
     /// Reads until `count` bytes are available. False when the input ends, or fails, before.
     [[nodiscard]] bool ensure(std::size_t count) { return available().size() >= count || fill(count); }
     /// The bytes that have been read and not skipped. Valid until the next `ensure`.
     [[nodiscard]] Bytes available() const { return {_chunk->data() + _begin, _end - _begin}; }
-    /// Bytes skipped so far: the offset of the available ones in the input.
+    /// With the bytes skipped so far: the offset of the available ones in the input.
     [[nodiscard]] std::uint64_t offset() const { return _offset; }
     /// Precondition: `count` bytes are available.
     void skip(std::size_t count) {
@@ -60,7 +62,7 @@ private:
     Chunk _spare; ///< the previous chunk, for reuse once it is unreferenced
     std::size_t _begin = 0;
     std::size_t _end = 0;
-    std::uint64_t _offset = 0;
+    std::uint64_t _offset;
     bool _ended = false;
     std::optional<Failure> _failure;
 };

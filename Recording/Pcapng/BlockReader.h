@@ -34,12 +34,18 @@ public:
     /// options.
     static constexpr std::size_t maximumBlockSize = maximumMessageSize + (std::size_t{1} << 20);
 
-    explicit BlockReader(ChunkedInput input) : _input(std::move(input)) {}
+    /// `bigEndian`: the byte order of the section that the input begins in, where that is not its first byte.
+    explicit BlockReader(ChunkedInput input, bool bigEndian = false)
+        : _input(std::move(input)), _bigEndian(bigEndian) {}
 
     /// Whether the input begins as a pcapng file does. Call it before the first `next`.
     [[nodiscard]] Result<Done> expectSection();
     /// The next complete block, valid until the next call; null at the end or once reading has failed.
     [[nodiscard]] const Block* next();
+    /// Where the input goes on after the block that `next` last returned.
+    [[nodiscard]] std::uint64_t nextOffset() const { return _input.offset() + _present.length; }
+    /// The byte order of the present section.
+    [[nodiscard]] bool isBigEndian() const { return _bigEndian; }
     /// What was skipped before the block, or the end, that `next` last returned; without its record number.
     [[nodiscard]] bool hasLoss() const { return _loss.has_value(); }
     [[nodiscard]] std::optional<Loss> takeLoss() { return std::exchange(_loss, std::nullopt); }
@@ -60,7 +66,7 @@ private:
 
     ChunkedInput _input;
     Block _present; ///< what `next` last returned
-    bool _bigEndian = false;
+    bool _bigEndian;
     std::optional<Loss> _loss;
 };
 

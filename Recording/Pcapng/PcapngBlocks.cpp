@@ -51,6 +51,14 @@ void putOption(Buffer& buffer, std::uint16_t code, std::string_view text) {
     putOption(buffer, code, Bytes(reinterpret_cast<const std::uint8_t*>(text.data()), text.size()));
 }
 
+/// The length of the options that hold the comments.
+std::size_t sizeOf(std::span<const std::string> comments) {
+    std::size_t size = comments.empty() ? 0 : optionSize(0);
+    for (const std::string& comment : comments)
+        size += optionSize(comment.size());
+    return size;
+}
+
 /// The 32-bit field at that offset of the first block. Precondition: it lies within the block.
 std::uint32_t u32At(Bytes blocks, std::size_t offset) {
     return ByteReader(blocks, false).u32(offset);
@@ -119,10 +127,12 @@ void appendPositionInterface(Buffer& buffer) {
     appendDescription(buffer, pcapng::positionLinkType, pcapng::positionName);
 }
 
-void appendPacket(Buffer& buffer, Time time, Bytes message, std::uint32_t interface) {
+void appendPacket(Buffer& buffer, Time time, Bytes message, std::uint32_t interface,
+                  std::span<const std::string> comments) {
     const auto stamp = static_cast<std::uint64_t>(std::max<std::int64_t>(time.time_since_epoch().count(), 0));
     const Bytes first = message.first(std::min(message.size(), pcapng::longestPart));
-    const auto length = static_cast<std::uint32_t>(packetOverhead + pcapng::padded(first.size()));
+    const auto length =
+        static_cast<std::uint32_t>(packetOverhead + pcapng::padded(first.size()) + sizeOf(comments));
     put32(buffer, BlockType::EnhancedPacket);
     put32(buffer, length);
     put32(buffer, interface);
@@ -131,6 +141,10 @@ void appendPacket(Buffer& buffer, Time time, Bytes message, std::uint32_t interf
     put32(buffer, static_cast<std::uint32_t>(first.size()));
     put32(buffer, static_cast<std::uint32_t>(message.size()));
     putPadded(buffer, first);
+    for (const std::string& comment : comments)
+        putOption(buffer, Option::Comment, comment);
+    if (!comments.empty())
+        putOption(buffer, Option::End, std::string_view());
     put32(buffer, length);
     for (std::size_t offset = first.size(); offset < message.size(); offset += pcapng::longestPart)
         appendPart(buffer, offset,
@@ -150,9 +164,9 @@ void appendComment(Buffer& buffer, std::string_view comment) {
     put32(buffer, length);
 }
 
-std::size_t packetSize(std::size_t messageSize) {
+std::size_t packetSize(std::size_t messageSize, std::span<const std::string> comments) {
     const std::size_t parts = messageSize == 0 ? 0 : (messageSize - 1) / pcapng::longestPart;
-    return packetOverhead + parts * partOverhead + pcapng::padded(messageSize);
+    return packetOverhead + parts * partOverhead + pcapng::padded(messageSize) + sizeOf(comments);
 }
 
 std::size_t completeBlocks(Bytes blocks, std::size_t length) {

@@ -8,6 +8,8 @@
 
 #include <cstddef>
 #include <cstdint>
+#include <span>
+#include <string>
 #include <string_view>
 #include <vector>
 
@@ -27,14 +29,16 @@ void appendPositionInterface(std::vector<std::uint8_t>& buffer);
 /// Adds a message's block, and those of its further parts where it is long (see pcapng::longestPart). A time
 /// before 1970 cannot be written and becomes 1970-01-01. Precondition: the message is not above
 /// `maximumMessageSize`. `interface`: the number of its interface description, from 0.
-void appendPacket(std::vector<std::uint8_t>& buffer, Time time, Bytes message, std::uint32_t interface = 0);
+/// `comments`: options of the block, of at most 65535 bytes each.
+void appendPacket(std::vector<std::uint8_t>& buffer, Time time, Bytes message, std::uint32_t interface = 0,
+                  std::span<const std::string> comments = {});
 
 /// Adds a block of statistics of the first interface, which holds nothing but a comment. Precondition: that
 /// has at most 65535 bytes.
 void appendComment(std::vector<std::uint8_t>& buffer, std::string_view comment);
 
 /// The length of a message's blocks.
-[[nodiscard]] std::size_t packetSize(std::size_t messageSize);
+[[nodiscard]] std::size_t packetSize(std::size_t messageSize, std::span<const std::string> comments = {});
 
 /// Of blocks as the functions above make them: the length of those that lie wholly within the first `length`
 /// bytes, a message's blocks counting as one.

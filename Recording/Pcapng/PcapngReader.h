@@ -37,6 +37,13 @@ namespace velmora {
 /// For a copy of the file, `setOtherBlocks` gives what is neither a message nor lost, and `block` the block
 /// of a message.
 class PcapngReader final : public MessageReader {
+    struct Interface {
+        enum class Use : std::uint8_t { Messages, OtherTechnology, Positions, OtherLinkType, Unreadable };
+        Use use = Use::Messages;
+        std::uint32_t technology = 0; ///< its index; of messages
+        InterfaceDescription description;
+    };
+
 public:
     /// What was skipped because it is not a log message.
     struct PassedOver {
@@ -61,6 +68,22 @@ public:
     [[nodiscard]] const std::optional<Failure>& failure() const override { return _blocks.failure(); }
     [[nodiscard]] const PassedOver& passedOver() const { return _passedOver; }
 
+    /// Where a reader stands between two messages, and what it knows of the file by then.
+    struct Place {
+        std::uint64_t offset = 0; ///< of the next block
+        bool bigEndian = false;
+        std::vector<Interface> interfaces;
+        std::vector<std::string> technologies;
+        std::uint64_t packets = 0;
+        std::uint64_t sections = 0;
+        std::uint64_t interfaceCount = 0;
+        Time lastTime{};
+    };
+    [[nodiscard]] Place place() const;
+    /// A reader of the same file that begins at the place, which is where the input begins. It reports the
+    /// losses and comments from there on.
+    [[nodiscard]] static std::unique_ptr<PcapngReader> resume(ChunkedInput input, const Place& place);
+
     using Block = BlockReader::Block;
     /// Passes on all blocks that hold no message and are not damaged, in the file's order between the
     /// messages: section headers, interface descriptions, blocks that are not known here, packets of other
@@ -72,13 +95,6 @@ public:
     [[nodiscard]] const Block& block() const { return *_messageBlock; }
 
 private:
-    struct Interface {
-        enum class Use : std::uint8_t { Messages, OtherTechnology, Positions, OtherLinkType, Unreadable };
-        Use use = Use::Messages;
-        std::uint32_t technology = 0; ///< its index; of messages
-        InterfaceDescription description;
-    };
-
     /// A packet block's fields, whichever of the three kinds it is.
     struct Packet {
         std::uint32_t interface = 0;
@@ -89,7 +105,8 @@ private:
         std::uint32_t original = 0; ///< bytes of the message
     };
 
-    explicit PcapngReader(ChunkedInput input) : _blocks(std::move(input)) {}
+    explicit PcapngReader(ChunkedInput input, bool bigEndian = false)
+        : _blocks(std::move(input), bigEndian) {}
 
     [[nodiscard]] const Block* nextBlock();
     /// The index of the technology, which is added where it is new; none above the most that are read.

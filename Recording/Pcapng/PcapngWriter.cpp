@@ -73,17 +73,17 @@ PcapngWriter::~PcapngWriter() {
     static_cast<void>(closed); // callers that need the result call close themselves
 }
 
-Result<Done> PcapngWriter::append(Time time, Bytes message) {
+Result<Done> PcapngWriter::append(Time time, Bytes message, std::span<const std::string> comments) {
     if (_permanentError)
         return *_permanentError;
     if (message.size() > maximumMessageSize)
         return Failure{"message of " + std::to_string(message.size()) + " bytes, wanted at most " +
                        std::to_string(maximumMessageSize)};
-    if (!makeRoom(pcapngBlocks::packetSize(message.size()))) {
+    if (!makeRoom(pcapngBlocks::packetSize(message.size(), comments))) {
         _dropped += _dropping ? 1 : 0;
         return outcome();
     }
-    pcapngBlocks::appendPacket(_buffer, time, message);
+    pcapngBlocks::appendPacket(_buffer, time, message, 0, comments);
     ++_messages;
     return _temporaryError || waiting().size() < flushThreshold ? outcome() : flush();
 }

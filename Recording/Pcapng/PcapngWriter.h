@@ -14,6 +14,7 @@
 #include <cstdint>
 #include <memory>
 #include <optional>
+#include <span>
 #include <string>
 #include <string_view>
 #include <vector>
@@ -64,8 +65,9 @@ public:
     PcapngWriter& operator=(const PcapngWriter&) = delete;
 
     /// Adds a message as it arrived. A time before 1970 cannot be recorded and becomes 1970-01-01. A message
-    /// above 16 MiB is refused, which does not end the recording. Precondition: it has not been closed.
-    Result<Done> append(Time time, Bytes message);
+    /// above 16 MiB is refused, which does not end the recording. `comments`: texts about it, of at most
+    /// 65535 bytes each. Precondition: it has not been closed.
+    Result<Done> append(Time time, Bytes message, std::span<const std::string> comments = {});
     /// Adds an NMEA sentence as it arrived. It does not count as a message, and where messages are dropped it
     /// is dropped, too. Precondition: the recording has positions and has not been closed.
     Result<Done> appendSentence(Time time, std::string_view sentence);

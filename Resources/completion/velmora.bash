@@ -48,9 +48,16 @@ _velmora() {
         _filedir
         return
         ;;
+    --technology)
+        _velmora_offer "${_velmora_technologies[@]}"
+        return
+        ;;
     esac
     $split && return
-    _velmora_offer -h --help --version --sysroot --log-directory --start-service --mask-key --view --self-test --log --log-level
+    case $cur in
+    -*) _velmora_offer -h --help --version --sysroot --log-directory --start-service --mask-key --technology --view --self-test --log --log-level ;;
+    *) _filedir ;;
+    esac
 }
 
 # Completes a source: its kind, a scenario's name or a file, and then the options after commas.

@@ -52,6 +52,7 @@ std::unique_ptr<View> NavigationController::loadView() {
     stack->header().setCommand(toQt(_headerCommand.title));
     stack->setToolbarHidden(_isToolbarHidden);
     stack->setNotice(_notice);
+    stack->setAccessories(_accessories);
     return stack;
 }
 
@@ -117,6 +118,12 @@ void NavigationController::goBack() {
     const std::function<void()> action = _leave.action; // the call may set another one
     if (action)
         action();
+}
+
+void NavigationController::setAccessories(std::vector<View*> views) {
+    _accessories = std::move(views);
+    if (isViewLoaded())
+        stackView().setAccessories(_accessories);
 }
 
 void NavigationController::showTop(const std::shared_ptr<ViewController>& old, bool isPush, bool animated) {

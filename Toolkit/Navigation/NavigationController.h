@@ -52,6 +52,8 @@ public:
     /// What the bar between header and pane says, on whatever pane; none at first.
     void setNotice(Notice notice);
     [[nodiscard]] const Notice& notice() const { return _notice; }
+    /// Views between pane and toolbar, on whatever pane, the first on top; none at first. Not owned.
+    void setAccessories(std::vector<View*> views);
 
     /// A button in the header of every pane; none at first, and for an empty title.
     void setHeaderCommand(std::string title, std::function<void()> action);
@@ -99,6 +101,7 @@ private:
     Command _headerCommand;
     Command _leave;
     bool _namesWindow = true;
+    std::vector<View*> _accessories;
     bool _isToolbarHidden = true;
     bool _isOnScreen = false;
 };

@@ -40,6 +40,21 @@ void NavigationView::setNotice(const Notice& notice) {
     layoutSubviews();
 }
 
+void NavigationView::setAccessories(const std::vector<View*>& views) {
+    for (View* const gone : _accessories)
+        gone->removeFromSuperview();
+    _accessories = views;
+    for (View* const view : views)
+        addSubview(*view);
+    layoutSubviews();
+}
+
+double NavigationView::heightOf(const View& accessory) const {
+    const QWidget& widget = *accessory.widget();
+    return widget.hasHeightForWidth() ? widget.heightForWidth(static_cast<int>(std::lround(bounds().width)))
+                                      : accessory.frame().height;
+}
+
 void NavigationView::showPane(View& pane, View* old, bool isPush, bool animated,
                               std::function<void()> atEnd) {
     finish();
@@ -92,7 +107,13 @@ void NavigationView::layoutSubviews() {
     const auto whole = [](double value) { return static_cast<int>(std::lround(value)); };
     _header->setGeometry(0, 0, whole(bounds().width), whole(barHeight));
     _toolbar->setGeometry(0, whole(bounds().height - below), whole(bounds().width), whole(barHeight));
-    const double room = std::max(bounds().height - barHeight - below, 0.0);
+    double bottom = bounds().height - below;
+    for (auto view = _accessories.rbegin(); view != _accessories.rend(); ++view) {
+        const double height = heightOf(**view);
+        bottom -= height;
+        (*view)->setFrame({0, bottom, bounds().width, height});
+    }
+    const double room = std::max(bottom - barHeight, 0.0);
     // However long its text, the notice leaves half of the room to the pane.
     const double notice =
         _notice->isHidden() ? 0 : std::min<double>(_notice->heightForWidth(whole(bounds().width)), room / 2);

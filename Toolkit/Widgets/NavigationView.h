@@ -9,9 +9,12 @@
 #include "Toolkit/Widgets/NoticeBar.h"
 #include "Toolkit/Widgets/Toolbar.h"
 
+#include <vector>
+
 namespace velmora {
 
-/// What a navigation stack looks like: header, notice where there is one, pane, toolbar.
+/// What a navigation stack looks like: header, notice where there is one, pane, accessories
+/// where there are any, toolbar.
 class NavigationView : public View {
 public:
     NavigationView();
@@ -21,6 +24,9 @@ public:
     [[nodiscard]] Toolbar& toolbar() { return *_toolbar; }
     void setToolbarHidden(bool isHidden);
     void setNotice(const Notice& notice);
+    /// Shows the views between pane and toolbar, the first on top: as high as they are, or as their widgets
+    /// want to be at the width.
+    void setAccessories(const std::vector<View*>& views);
 
     /// Replaces the old pane (there may be none): sliding in from the right for a push, uncovered from the
     /// left otherwise. An earlier animation ends first.
@@ -34,6 +40,7 @@ public:
 
 private:
     void placePane(double part) const;
+    [[nodiscard]] double heightOf(const View& accessory) const;
 
     HeaderBar* _header;
     NoticeBar* _notice;
@@ -41,6 +48,7 @@ private:
     View _container;
     View* _pane = nullptr;
     View* _old = nullptr;
+    std::vector<View*> _accessories;
     bool _isPush = true;
     Animation _animation;
 };

@@ -6,13 +6,27 @@
 #include "Toolkit/Widgets/SheetWidget.h"
 
 #include <QApplication>
+#include <QDropEvent>
+#include <QFile>
 #include <QKeyEvent>
+#include <QMimeData>
 #include <QPointer>
+#include <QUrl>
 #include <QWindow>
 
 #include <utility>
 
 namespace velmora {
+
+namespace {
+
+/// Empty where what is dropped is not one file of this machine.
+QString droppedFile(const QMimeData& data) {
+    const QList<QUrl> urls = data.urls();
+    return urls.size() == 1 && urls.front().isLocalFile() ? urls.front().toLocalFile() : QString();
+}
+
+} // namespace
 
 WindowWidget::WindowWidget() {
     setObjectName("velmora.window");
@@ -106,6 +120,26 @@ void WindowWidget::keyPressEvent(QKeyEvent* event) {
 void WindowWidget::resizeEvent(QResizeEvent* /*event*/) {
     if (onResize)
         onResize();
+}
+
+void WindowWidget::dragEnterEvent(QDragEnterEvent* event) {
+    if (!droppedFile(*event->mimeData()).isEmpty())
+        event->acceptProposedAction();
+}
+
+void WindowWidget::dropEvent(QDropEvent* event) {
+    const QString path = droppedFile(*event->mimeData());
+    if (path.isEmpty() || !onDrop)
+        return;
+    event->acceptProposedAction();
+    // Once the drop is over: what opens the file may take a while.
+    QMetaObject::invokeMethod(
+        this,
+        [this, path] {
+            if (onDrop)
+                onDrop(QFile::encodeName(path).toStdString());
+        },
+        Qt::QueuedConnection);
 }
 
 } // namespace velmora

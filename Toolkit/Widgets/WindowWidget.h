@@ -7,6 +7,7 @@
 
 #include <functional>
 #include <map>
+#include <string>
 
 class QKeyEvent;
 
@@ -26,6 +27,8 @@ public:
     std::map<int, std::function<void()>> commands;
     /// Called once, when the window's contents are on the screen.
     std::function<void()> onPainted;
+    /// Called with the path of a file that is dropped on the window.
+    std::function<void(const std::string& path)> onDrop;
     /// Sets the default keyboard focus when no widget has it.
     std::function<void()> onFocus;
 
@@ -48,6 +51,8 @@ protected:
     void showEvent(QShowEvent* event) override;
     void keyPressEvent(QKeyEvent* event) override;
     void resizeEvent(QResizeEvent* event) override;
+    void dragEnterEvent(QDragEnterEvent* event) override;
+    void dropEvent(QDropEvent* event) override;
 
 private:
     void paintFirst();

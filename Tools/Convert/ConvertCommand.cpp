@@ -5,6 +5,7 @@
 
 #include "Platform/Linux/Files/AtomicFile.h"
 #include "Platform/Linux/Files/Files.h"
+#include "Recorder/OverwriteTarget.h"
 #include "Recording/OpenMessages.h"
 #include "Recording/Positions/TrackFile.h"
 #include "Tools/Convert/Conversion.h"
@@ -13,7 +14,6 @@
 #include "Tools/ExitStatus.h"
 #include "Tools/Messages/TechnologyChoice.h"
 #include "Tools/OutputGuard.h"
-#include "Tools/OverwriteTarget.h"
 #include "Tools/Report.h"
 #include "Tools/Stats/StatsOptions.h"
 

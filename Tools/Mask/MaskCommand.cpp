@@ -5,6 +5,7 @@
 
 #include "Export/Masking/MessageMask.h"
 #include "Platform/Linux/Files/AtomicFile.h"
+#include "Recorder/OverwriteTarget.h"
 #include "Recording/OpenMessages.h"
 #include "Tools/Decode/Decoding.h"
 #include "Tools/ExitStatus.h"
@@ -15,7 +16,6 @@
 #include "Tools/Mask/ReportText.h"
 #include "Tools/Output.h"
 #include "Tools/OutputGuard.h"
-#include "Tools/OverwriteTarget.h"
 #include "Tools/Report.h"
 
 #include <filesystem>

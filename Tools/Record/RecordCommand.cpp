@@ -3,10 +3,10 @@
 
 #include "Tools/Record/RecordCommand.h"
 
+#include "Recorder/RecordingSession.h"
 #include "Tools/ExitStatus.h"
 #include "Tools/Record/Positions/RecordedPositions.h"
 #include "Tools/Record/Recorder.h"
-#include "Tools/Record/RecordingSession.h"
 #include "Tools/Report.h"
 #include "Tools/ServiceClient.h"
 

@@ -3,12 +3,12 @@
 
 #pragma once
 
+#include "Recorder/RecordingSession.h"
 #include "Tools/Log/ServiceLog.h"
 #include "Tools/Record/Positions/RecordedPositions.h"
 #include "Tools/Record/RecordOptions.h"
 #include "Tools/Record/RecordingModel.h"
 #include "Tools/Record/RecordingNews.h"
-#include "Tools/Record/RecordingSession.h"
 #include "Tools/ServiceClient.h"
 
 #include <memory>

@@ -3,8 +3,8 @@
 
 #pragma once
 
+#include "Recorder/RecordingSession.h"
 #include "Tools/LogOverride.h"
-#include "Tools/Record/RecordingSession.h"
 
 #include <cstddef>
 #include <cstdint>

@@ -115,6 +115,15 @@ void NeighboringCells::updateWithData(const Data& data, std::uint32_t logCode) {
     }
 }
 
+Value NeighboringCells::memory() const {
+    return arfcnToBsic.empty() ? Value() : Value(Data::copyOf(arfcnToBsic));
+}
+
+void NeighboringCells::setMemory(const Value& memory) {
+    const Bytes bytes = memory.asData() ? memory.asData()->bytes() : Bytes();
+    arfcnToBsic.assign(bytes.begin(), bytes.end());
+}
+
 void NeighboringCells::decode(const View& view, const Record& record, FieldVisitor& visitor) const {
     if (view.code == cellInformation.code) {
         CellSection::decode(view, record, visitor);

@@ -17,6 +17,9 @@ public:
     [[nodiscard]] std::string_view getSectionName() const override { return "Neighboring Cells"; }
     [[nodiscard]] std::span<const View> views() const override;
     void updateWithData(const Data& data, std::uint32_t logCode) override;
+    /// The BSICs.
+    [[nodiscard]] Value memory() const override;
+    void setMemory(const Value& memory) override;
     void decode(const View& view, const Record& record, FieldVisitor& visitor) const override;
 
 private:

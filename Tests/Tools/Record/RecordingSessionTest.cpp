@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Tools/Record/RecordingSession.h"
+#include "Recorder/RecordingSession.h"
 
 #include "Tests/Tools/Record/RecordFixture.h"
 

@@ -1,11 +1,10 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Tools/Record/RecordingFile.h"
+#include "Recorder/RecordingFile.h"
 
 #include "Platform/Linux/Errno.h"
-#include "Tools/OverwriteTarget.h"
-#include "Tools/Report.h"
+#include "Recorder/OverwriteTarget.h"
 
 #include <cerrno>
 #include <chrono>
@@ -73,7 +72,7 @@ Result<RecordingFile> RecordingFile::open(const std::string& path, bool force) {
     if (!lockRecording(file.descriptor.get()))
         return Failure{path + " is being recorded to by another program"};
     if (!file.isCreated && !force)
-        return Failure{fileExistsMessage(path)};
+        return Failure{existingFileMessage(path)};
     return file;
 }
 

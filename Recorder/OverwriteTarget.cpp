@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Tools/OverwriteTarget.h"
+#include "Recorder/OverwriteTarget.h"
 
 #include <system_error>
 
@@ -22,6 +22,10 @@ Result<std::filesystem::path> overwriteTarget(const std::string& path) {
         return Failure{path + " is a symbolic link to " + target.string() +
                        ", wanted a regular file of this user"};
     return target;
+}
+
+std::string existingFileMessage(const std::string& path) {
+    return path + " is there already; --force overwrites it";
 }
 
 } // namespace velmora

@@ -15,4 +15,7 @@ namespace velmora {
 /// a shared directory any user may have made it.
 [[nodiscard]] Result<std::filesystem::path> overwriteTarget(const std::string& path);
 
+/// The message of a command that refuses to overwrite a file.
+[[nodiscard]] std::string existingFileMessage(const std::string& path);
+
 } // namespace velmora

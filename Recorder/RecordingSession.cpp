@@ -1,14 +1,15 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Tools/Record/RecordingSession.h"
+#include "Recorder/RecordingSession.h"
 
 #include "Platform/Linux/Errno.h"
 #include "Platform/Linux/Files/AtomicFile.h"
 #include "Platform/TelephonyService.h"
+#include "Recorder/OverwriteTarget.h"
 #include "Recording/Files/DescriptorFile.h"
-#include "Tools/OverwriteTarget.h"
 
+#include <algorithm>
 #include <filesystem>
 #include <utility>
 
@@ -101,11 +102,14 @@ Result<std::unique_ptr<PcapngWriter>> RecordingSession::overwriteWith(std::strin
     _file.descriptor.reset(); // the old one, which was locked until now
     return writer;
 }
+
 Result<Done> RecordingSession::append(Time time, Bytes message) {
     const std::uint64_t before = _writer->messages();
-    Result<Done> appended = _writer->append(time, message);
-    if (_writer->messages() != before)
+    Result<Done> appended = _writer->append(time, message, _notes);
+    if (_writer->messages() != before) {
         _bytes += message.size();
+        _notes.clear();
+    }
     return keepTemporaryError(std::move(appended));
 }
 
@@ -114,6 +118,15 @@ Result<Done> RecordingSession::appendSentence(Time time, std::string_view senten
         return Done{};
     ++_sentences;
     return keepTemporaryError(_writer->appendSentence(time, sentence));
+}
+
+void RecordingSession::note(std::string text) {
+    std::size_t length = std::min(text.size(), longestNote);
+    // Not within a character.
+    while (length < text.size() && length > 0 && (static_cast<std::uint8_t>(text[length]) & 0xC0) == 0x80)
+        --length;
+    text.resize(length);
+    _notes.push_back(std::move(text));
 }
 
 Result<Done> RecordingSession::save() {

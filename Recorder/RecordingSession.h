@@ -5,9 +5,10 @@
 
 #include "Platform/Clock.h"
 #include "Platform/Result.h"
+#include "Recorder/RecordingFile.h"
 #include "Recording/Pcapng/PcapngWriter.h"
-#include "Tools/Record/RecordingFile.h"
 
+#include <cstddef>
 #include <cstdint>
 #include <memory>
 #include <optional>
@@ -46,6 +47,12 @@ public:
     /// A sentence of the receiver has arrived; as a message. It is lost while the technology is unknown.
     /// Precondition: the recording has positions.
     Result<Done> appendSentence(Time time, std::string_view sentence);
+    /// A text of the user's about this moment, which goes into the file as a comment on the next message; cut
+    /// to `longestNote` bytes.
+    void note(std::string text);
+    /// Notes that no message has followed yet.
+    [[nodiscard]] std::size_t waitingNotes() const { return _notes.size(); }
+    static constexpr std::size_t longestNote = 1000;
     /// Writes the buffer to the file and starts its sync to storage; does nothing before the technology is
     /// known but to notice that others have changed the file. Retries after a temporary error. A failure is
     /// as above.
@@ -109,6 +116,7 @@ private:
     std::uint64_t _bytes = 0;
     std::uint64_t _sentences = 0;
     PcapngWriter::Positions _positions = PcapngWriter::Positions::Without;
+    std::vector<std::string> _notes; ///< for the next message
     std::vector<Move> _moves;
     std::optional<std::uint64_t> _messagesBeforeMove;
 };

@@ -1,0 +1,92 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
+#include "App/MaskingModel.h"
+#include "App/Playback/PlaybackController.h"
+#include "App/Recording/RecordingSwitch.h"
+#include "App/VelmoraApp.h"
+#include "App/VelmoraPaneController.h"
+#include "Platform/PrintableText.h"
+#include "Platform/SystemLog.h"
+#include "Toolkit/Alert.h"
+#include "Toolkit/Navigation/NavigationController.h"
+
+#include <utility>
+#include <vector>
+
+// What the application does with recordings: those that are shown, and the one that is made.
+
+namespace velmora {
+
+void VelmoraApp::makeRecordingSwitch() {
+    _recording = std::make_unique<RecordingSwitch>(
+        *_platform, [this] { showBars(); }, [this] { updateNotice(); });
+    const auto model = std::make_shared<MaskingModel>(_platform->model(), this, *_privacy);
+    model->setOnShown([this](const Data& message) {
+        if (_recording)
+            _recording->take(message);
+    });
+    _model = model;
+}
+
+void VelmoraApp::showBars() {
+    std::vector<View*> bars;
+    if (_playback)
+        bars.push_back(&_playback->bar());
+    if (RecordingBar* const bar = _recording->bar())
+        bars.push_back(bar);
+    _navController->setAccessories(std::move(bars));
+}
+
+void VelmoraApp::openRecording(const std::string& path, const std::string& technology) {
+    if (!_model) // shut down
+        return;
+    Result<std::unique_ptr<PlaybackController>> opened =
+        PlaybackController::open(_platform->model(), path, technology,
+                                 {[this] { showMoment(); }, [this] { updateNotice(); },
+                                  [this](const LoggedMessage& message, std::string_view shown) {
+                                      return _privacy->shown(message.message, shown, message.time);
+                                  }});
+    if (!opened) {
+        const std::string reason = path + ": " + opened.reason();
+        logLine(LogPriority::Error, reason);
+        Alert("Recording", printable(reason), "Close").show();
+        return;
+    }
+    _endsOnceSaved = false;
+    closeSaveView();
+    _navController->setAccessories({});
+    _playback = *std::move(opened);
+    clearPanes();
+    showBars();
+    showMoment();
+    updateNotice();
+}
+
+void VelmoraApp::closeRecording() {
+    if (!_playback)
+        return;
+    closeSaveView();
+    _navController->setAccessories({});
+    _playback.reset();
+    showBars();
+    clearPanes();
+    if (std::exchange(_recordingPath, {}).empty())
+        updateViewControllerFromModel(); // which has gone on
+    else
+        connectFirst();
+    updateNotice();
+}
+
+void VelmoraApp::showMoment() {
+    if (!_playback) // it is being opened
+        return;
+    const std::optional<Time> moment = _playback->moment();
+    std::string status = moment ? _dateFormatter->stringFromDate(*moment) : "At the start";
+    if (const std::string progress = _playback->progress(); !progress.empty())
+        status += ", " + progress;
+    setUpdateMessage(std::move(status));
+    redraw();
+}
+
+} // namespace velmora
