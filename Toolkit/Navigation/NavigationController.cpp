@@ -129,6 +129,7 @@ void NavigationController::fillBars(bool /*animated*/) {
     stack.header().setTitle(toQt(top.title()));
     const bool hasBack = _panes.size() > 1;
     stack.header().setBack(hasBack, hasBack ? toQt(_panes[_panes.size() - 2]->title()) : QString());
+    stack.fitHeader();
     stack.toolbar().setItems(top.toolbarItems());
     if (auto* const window = dynamic_cast<WindowWidget*>(stack.widget()->window()))
         window->setWindowTitle(toQt(top.title()));

@@ -33,10 +33,13 @@ public:
     void setTitle(const QString& title);
     /// Shows the way back to a screen of that title.
     void setBack(bool isShown, const QString& title);
+    /// Takes that width, and returns the height that the title needs in it.
+    [[nodiscard]] int fitWidth(int width);
 
 protected:
     void paintEvent(QPaintEvent* event) override;
     void resizeEvent(QResizeEvent* event) override;
+    void changeEvent(QEvent* event) override;
 
 private:
     void layoutParts();

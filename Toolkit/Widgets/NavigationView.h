@@ -21,6 +21,8 @@ public:
     [[nodiscard]] Toolbar& toolbar() { return *_toolbar; }
     void setToolbarHidden(bool isHidden);
     void setNotice(const Notice& notice);
+    /// The header has another title, which may need another height.
+    void fitHeader();
 
     /// Replaces the old pane (there may be none): sliding in from the right for a push, uncovered from the
     /// left otherwise. An earlier animation ends first.
