@@ -12,6 +12,7 @@
 #include <QApplication>
 #include <QEvent>
 #include <QIcon>
+#include <QLocale>
 
 #include <optional>
 #include <stdexcept>
@@ -36,6 +37,9 @@ public:
 Application::Application(int& argc, char** argv) : _impl(std::make_unique<Impl>(argc, argv)) {
     theApplication = this;
     installAccessibility();
+    // Qt would take it from a translation, which there is none of.
+    if (QLocale::system().textDirection() == Qt::RightToLeft)
+        QGuiApplication::setLayoutDirection(Qt::RightToLeft);
     // The delegate hears of the end before the loop stops.
     QApplication::setQuitOnLastWindowClosed(false);
     QObject::connect(&_impl->qt, &QApplication::lastWindowClosed, &_impl->qt, [this] {

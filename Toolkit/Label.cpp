@@ -53,6 +53,10 @@ void Label::setTextAlignment(TextAlignment alignment) {
     _label->setAlignment(horizontal | Qt::AlignVCenter);
 }
 
+void Label::setHeading(bool isHeading) {
+    _label->setHeading(isHeading);
+}
+
 void Label::sizeToFit() {
     const Size size = sizeOfText(text(), _font);
     setFrame({frame().x, frame().y, size.width, size.height});

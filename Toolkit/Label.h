@@ -12,6 +12,7 @@ namespace velmora {
 
 class LabelWidget;
 
+/// Left is where lines begin: on the right in a layout from right to left.
 enum class TextAlignment { left, center, right };
 
 /// One line of plain text, in the middle of its frame's height. Text that does not fit ends in an ellipsis.
@@ -29,6 +30,8 @@ public:
     void setTextColor(Color color);
     [[nodiscard]] TextAlignment textAlignment() const;
     void setTextAlignment(TextAlignment alignment);
+    /// Whether screen readers take it for a heading; not at first.
+    void setHeading(bool isHeading);
 
     /// The size of the text in the font.
     void sizeToFit() override;

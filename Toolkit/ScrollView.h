@@ -20,7 +20,7 @@ public:
     [[nodiscard]] Size contentSize() const;
     void setContentSize(const Size& size);
 
-    /// The content's point at the frame's left edge: 0 to `maximumOffset`.
+    /// How far the content has moved from where it begins: 0 to `maximumOffset`.
     [[nodiscard]] double contentOffset() const;
     void setContentOffset(double x);
     /// How far the content can move: its width less the frame's, at least 0.

@@ -9,6 +9,7 @@
 #include <QEvent>
 #include <QMouseEvent>
 #include <QPointer>
+#include <QStyle>
 #include <QWidget>
 
 #include <algorithm>
@@ -33,6 +34,10 @@ public:
 
 /// A tap is a press and a release that both come up to the view, unused by what lies on it.
 bool View::State::eventFilter(QObject* watched, QEvent* event) {
+    // In a layout from right to left the places of the subviews depend on the width.
+    if (event->type() == QEvent::Resize || event->type() == QEvent::LayoutDirectionChange)
+        for (View* const subview : subviews)
+            subview->place();
     const bool isPress = event->type() == QEvent::MouseButtonPress;
     if (watched != widget || !onTap || (!isPress && event->type() != QEvent::MouseButtonRelease))
         return false;
@@ -77,9 +82,19 @@ Rect View::frame() const {
 void View::setFrame(const Rect& frame) {
     const bool isResized = frame.size() != _state->frame.size();
     _state->frame = frame;
-    _state->widget->setGeometry(toQt(frame));
-    if (isResized)
-        layoutSubviews();
+    place();
+    if (!isResized)
+        return;
+    for (View* const subview : _state->subviews) // a view that is not shown gets no event yet
+        subview->place();
+    layoutSubviews();
+}
+
+void View::place() {
+    QWidget& widget = *_state->widget;
+    const QRect place = toQt(_state->frame);
+    const QWidget* const outer = widget.isWindow() ? nullptr : widget.parentWidget();
+    widget.setGeometry(outer ? QStyle::visualRect(outer->layoutDirection(), outer->rect(), place) : place);
 }
 
 Rect View::bounds() const {
@@ -91,7 +106,8 @@ void View::addSubview(View& view) {
     _state->subviews.push_back(&view);
     view._state->superview = this;
     view.widget()->setParent(subviewWidget());
-    view.widget()->setGeometry(toQt(view.frame()));
+    subviewWidget()->installEventFilter(_state.get());
+    view.place();
     view.widget()->setVisible(!view.isHidden());
 }
 

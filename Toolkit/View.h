@@ -26,7 +26,8 @@ public:
     View(const View&) = delete;
     View& operator=(const View&) = delete;
 
-    /// Place and size in the superview. Reads back as it was set; what is drawn lies on whole points.
+    /// Place and size in the superview. Reads back as it was set; what is drawn lies on whole points, and in
+    /// a layout from right to left as far from the right edge as the frame is from the left one.
     [[nodiscard]] Rect frame() const;
     /// Calls `layoutSubviews` when the size is another than before.
     void setFrame(const Rect& frame);
@@ -76,6 +77,9 @@ protected:
 
 private:
     class State;
+    /// Puts the widget where the frame says.
+    void place();
+
     std::unique_ptr<State> _state;
 };
 

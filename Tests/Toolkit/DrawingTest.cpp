@@ -93,7 +93,7 @@ TEST_F(DrawingTest, ATitleIsInTheMiddleAndKeepsItsEndsWhereItIsTooLong) {
     auto* const title = static_cast<LabelWidget*>(find(stage.window, "velmora.title"));
     EXPECT_NEAR(title->geometry().center().x(), 200, 1);
     pane.setTitle("From " + std::string(100, 'm') + " to");
-    EXPECT_TRUE(title->shownText().startsWith("From "));
+    EXPECT_TRUE(title->shownText().startsWith("From\n")); // the word after it is wider than a line
     EXPECT_TRUE(title->shownText().endsWith(" to"));
     EXPECT_TRUE(title->shownText().contains(QChar(0x2026)));
 }

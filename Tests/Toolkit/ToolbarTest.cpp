@@ -167,11 +167,11 @@ TEST_F(ToolbarTest, AHiddenToolbarLeavesItsRoomToThePane) {
     EXPECT_EQ(item("velmora.toolbar"), nullptr);
 }
 
-TEST_F(ToolbarTest, AStatusWithoutRoomEndsInAnEllipsis) {
+TEST_F(ToolbarTest, AStatusWithoutRoomBeginsWithAnEllipsis) {
     fill(std::string(200, 'm'), false);
     auto* const status = static_cast<LabelWidget*>(item("velmora.status"));
     EXPECT_LT(status->geometry().right(), item("velmora.save")->x());
-    EXPECT_TRUE(status->shownText().endsWith(QChar(0x2026)));
+    EXPECT_TRUE(status->shownText().startsWith(QChar(0x2026)));
     EXPECT_EQ(item("velmora.save")->geometry().right() + 1, 400 - 12);
 }
 

@@ -11,8 +11,8 @@
 
 namespace velmora {
 
-/// A text in a toolbar, as wide as it needs; where the toolbar has less room it ends in an ellipsis. Starts
-/// with the system font of size 14, dark text, clear background.
+/// A text in a toolbar, as wide as it needs; where the toolbar has less room it begins with an ellipsis.
+/// Starts with the system font of size 14, dark text, clear background.
 class LabelItem : public ToolbarItem {
 public:
     explicit LabelItem(std::string text = {});

@@ -163,6 +163,7 @@ void NavigationController::fillBars(bool /*animated*/) {
     const bool hasBack = _panes.size() > 1;
     stack.header().setBack(hasBack || !_leave.title.empty(),
                            toQt(hasBack ? _panes[_panes.size() - 2]->title() : _leave.title));
+    stack.fitHeader();
     stack.toolbar().setItems(top.toolbarItems());
     if (auto* const window = dynamic_cast<WindowWidget*>(stack.widget()->window()); window && _namesWindow)
         window->setWindowTitle(toQt(top.title()));

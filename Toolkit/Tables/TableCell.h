@@ -4,6 +4,7 @@
 #pragma once
 
 #include "Toolkit/Label.h"
+#include "Toolkit/Tables/TableCellAccessory.h"
 #include "Toolkit/View.h"
 
 #include <memory>
@@ -17,8 +18,6 @@ enum class TableCellStyle {
     plain = 0, ///< one text, on the left
     value = 1  ///< a left and a right text
 };
-
-enum class TableCellAccessory { none, disclosureIndicator, checkMark };
 
 /// One row of a table on the screen. The data source makes cells and the table keeps them for reuse when
 /// their row leaves the screen. A row's content goes into the content view, which is the cell without the

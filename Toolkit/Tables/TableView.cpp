@@ -5,6 +5,7 @@
 
 #include "Toolkit/Tables/TableCell.h"
 #include "Toolkit/Widgets/Conversions.h"
+#include "Toolkit/Widgets/Tables/EmptyLabel.h"
 #include "Toolkit/Widgets/Tables/TableWidget.h"
 
 #include <QScrollBar>
@@ -31,6 +32,11 @@ void TableView::setDataSource(TableViewDataSource* dataSource) {
 
 void TableView::setDelegate(TableViewDelegate* delegate) {
     _table->delegate = delegate;
+}
+
+void TableView::setEmptyText(std::string_view text) {
+    _table->emptyLabel().setText(toQt(text));
+    _table->showEmptyLabel();
 }
 
 void TableView::reloadData() {
@@ -107,7 +113,8 @@ void TableView::scrollToRow(const IndexPath& indexPath) {
 
 void TableView::sizeToFit() {
     _table->loadIfNeeded();
-    double height = static_cast<double>(_table->rows().total()) * rowHeight();
+    const std::size_t least = _table->emptyLabel().text().isEmpty() ? 0 : 1;
+    double height = static_cast<double>(std::max(_table->rows().total(), least)) * rowHeight();
     if (superview())
         height = std::min(height, std::max(superview()->bounds().height - frame().y, 0.0));
     setFrame({frame().x, frame().y, frame().width, height});

@@ -38,6 +38,9 @@ public:
     void setDataSource(TableViewDataSource* dataSource);
     void setDelegate(TableViewDelegate* delegate);
 
+    /// What the table says while it has no rows; nothing at first.
+    void setEmptyText(std::string_view text);
+
     /// Queries the data source again for everything.
     void reloadData();
     /// A queued cell of that identifier, or null.
@@ -71,7 +74,8 @@ public:
     void setContentOffset(double y);
     void scrollToRow(const IndexPath& indexPath);
 
-    /// The height of all rows, though no more than is left of the superview below the origin.
+    /// The height of all rows, or of one where the table says that it is empty, though no more than is left
+    /// of the superview below the origin.
     void sizeToFit() override;
 
 private:

@@ -9,4 +9,9 @@ std::size_t TableViewDataSource::numberOfSections(TableView& /*tableView*/) {
     return 1;
 }
 
+TableRowSummary TableViewDataSource::summaryOfRowAtIndexPath(TableView& /*tableView*/,
+                                                             const IndexPath& /*indexPath*/) {
+    return {};
+}
+
 } // namespace velmora

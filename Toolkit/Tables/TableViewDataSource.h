@@ -4,6 +4,7 @@
 #pragma once
 
 #include "Toolkit/Tables/IndexPath.h"
+#include "Toolkit/Tables/TableRowSummary.h"
 
 #include <cstddef>
 #include <memory>
@@ -24,6 +25,10 @@ public:
     /// shows an empty row.
     [[nodiscard]] virtual std::shared_ptr<TableCell> cellForRowAtIndexPath(TableView& tableView,
                                                                            const IndexPath& indexPath) = 0;
+    /// What screen readers say of a row that is not on the screen; it makes no cell. The default knows
+    /// nothing.
+    [[nodiscard]] virtual TableRowSummary summaryOfRowAtIndexPath(TableView& tableView,
+                                                                  const IndexPath& indexPath);
 };
 
 } // namespace velmora

@@ -4,21 +4,24 @@
 #include "Toolkit/Widgets/Accessibility.h"
 
 #include "Toolkit/Tables/TableCell.h"
-#include "Toolkit/Tables/TableView.h"
 #include "Toolkit/Widgets/Charts/ChartAccessible.h"
 #include "Toolkit/Widgets/Charts/ChartWidget.h"
 #include "Toolkit/Widgets/Conversions.h"
-#include "Toolkit/Widgets/HeaderBar.h"
+#include "Toolkit/Widgets/LabelWidget.h"
 #include "Toolkit/Widgets/SheetWidget.h"
 #include "Toolkit/Widgets/SpinnerWidget.h"
 #include "Toolkit/Widgets/Tables/CellWidget.h"
+#include "Toolkit/Widgets/Tables/EmptyLabel.h"
+#include "Toolkit/Widgets/Tables/RowDescription.h"
+#include "Toolkit/Widgets/Tables/TableAccessible.h"
 #include "Toolkit/Widgets/Tables/TableWidget.h"
+#include "Toolkit/Widgets/Toolbar.h"
+#include "Toolkit/Widgets/WindowWidget.h"
 #include "Toolkit/Widgets/WrappedLabel.h"
 
 #include <QAccessible>
 #include <QAccessibleWidget>
 
-#include <iterator>
 #include <utility>
 
 namespace velmora {
@@ -30,38 +33,6 @@ TableWidget* tableOf(const CellWidget& cell) {
     QWidget* const viewport = cell.parentWidget();
     return viewport ? dynamic_cast<TableWidget*>(viewport->parentWidget()) : nullptr;
 }
-
-/// A list of the rows on the screen.
-class TableAccessible : public QAccessibleWidget {
-public:
-    explicit TableAccessible(TableWidget& table)
-        : QAccessibleWidget(&table, QAccessible::List), _table(table) {}
-
-    [[nodiscard]] int childCount() const override { return static_cast<int>(_table.cells().size()); }
-    [[nodiscard]] QAccessibleInterface* child(int index) const override {
-        if (index < 0 || index >= childCount())
-            return nullptr;
-        return QAccessible::queryAccessibleInterface(
-            std::next(_table.cells().begin(), index)->second->widget());
-    }
-    [[nodiscard]] int indexOfChild(const QAccessibleInterface* child) const override {
-        for (int index = 0; index < childCount(); ++index)
-            if (std::next(_table.cells().begin(), index)->second->widget() == child->object())
-                return index;
-        return -1;
-    }
-    [[nodiscard]] QAccessibleInterface* childAt(int x, int y) const override {
-        const auto row = _table.rowAt(_table.viewport()->mapFromGlobal(QPoint(x, y)));
-        return QAccessible::queryAccessibleInterface(_table.cellWidget(row));
-    }
-    [[nodiscard]] QAccessibleInterface* focusChild() const override {
-        CellWidget* const cell = _table.hasFocus() ? _table.cellWidget(_table.focusRow()) : nullptr;
-        return cell ? QAccessible::queryAccessibleInterface(cell) : nullptr;
-    }
-
-private:
-    TableWidget& _table;
-};
 
 /// A row: one thing with a name, whatever it is made of.
 class RowAccessible : public QAccessibleWidget {
@@ -77,22 +48,21 @@ public:
     [[nodiscard]] QString text(QAccessible::Text which) const override {
         if (which == QAccessible::Name && _cell.cell)
             return toQt(_cell.cell->rowName());
+        if (which == QAccessible::Description && _cell.cell)
+            return rowDescription(_cell.cell->accessory());
         return QAccessibleWidget::text(which);
     }
     [[nodiscard]] QAccessible::State state() const override {
-        QAccessible::State state = QAccessibleWidget::state();
         const TableWidget* const table = tableOf(_cell);
-        state.focusable = true;
-        state.selectable = true;
-        state.selected = _cell.isSelected();
-        state.focused = table && table->hasFocus() && _cell.row && table->focusRow() == _cell.row;
-        return state;
+        if (!table || !_cell.row || !_cell.cell)
+            return QAccessibleWidget::state();
+        return rowState(*table, *_cell.row, _cell.cell->accessory());
     }
-    [[nodiscard]] QStringList actionNames() const override { return {pressAction()}; }
+    [[nodiscard]] QStringList actionNames() const override { return {pressAction(), setFocusAction()}; }
     void doAction(const QString& name) override {
         TableWidget* const table = tableOf(_cell);
-        if (name == pressAction() && table && _cell.row)
-            table->activateRow(*_cell.row);
+        if (table && _cell.row)
+            doRowAction(*table, *_cell.row, name);
     }
 
 private:
@@ -115,6 +85,18 @@ private:
     SpinnerWidget& _spinner;
 };
 
+/// Nothing below it can be used.
+class SheetAccessible : public QAccessibleWidget {
+public:
+    explicit SheetAccessible(SheetWidget& sheet) : QAccessibleWidget(&sheet, QAccessible::Dialog) {}
+
+    [[nodiscard]] QAccessible::State state() const override {
+        QAccessible::State state = QAccessibleWidget::state();
+        state.modal = true;
+        return state;
+    }
+};
+
 AnnouncementListener theListener;
 
 QAccessibleInterface* makeInterface(const QString& /*className*/, QObject* object) {
@@ -122,12 +104,18 @@ QAccessibleInterface* makeInterface(const QString& /*className*/, QObject* objec
         return new TableAccessible(*table);
     if (auto* const cell = dynamic_cast<CellWidget*>(object))
         return new RowAccessible(*cell);
-    if (auto* const heading = dynamic_cast<HeadingLabel*>(object))
-        return new QAccessibleWidget(heading, QAccessible::Heading);
+    if (auto* const label = dynamic_cast<LabelWidget*>(object); label && label->isHeading())
+        return new QAccessibleWidget(label, QAccessible::Heading);
+    if (auto* const empty = dynamic_cast<EmptyLabel*>(object))
+        return new QAccessibleWidget(empty, QAccessible::StaticText, empty->text());
     if (auto* const notice = dynamic_cast<WrappedLabel*>(object))
         return new QAccessibleWidget(notice, QAccessible::AlertMessage);
     if (auto* const sheet = dynamic_cast<SheetWidget*>(object))
-        return new QAccessibleWidget(sheet, QAccessible::Dialog);
+        return new SheetAccessible(*sheet);
+    if (auto* const window = dynamic_cast<WindowWidget*>(object))
+        return new QAccessibleWidget(window, QAccessible::Window);
+    if (auto* const toolbar = dynamic_cast<Toolbar*>(object))
+        return new QAccessibleWidget(toolbar, QAccessible::ToolBar);
     if (auto* const spinner = dynamic_cast<SpinnerWidget*>(object))
         return new SpinnerAccessible(*spinner);
     if (auto* const chart = dynamic_cast<ChartWidget*>(object))

@@ -11,9 +11,8 @@ class QWidget;
 
 namespace velmora {
 
-/// Registers the accessible interfaces of tables, rows, headings, notices, sheets and busy
-/// indicators. Called once, by
-/// the application.
+/// Registers the accessible interfaces of windows, tables, rows, headings, notices, sheets, toolbars and busy
+/// indicators. Called once, by the application.
 void installAccessibility();
 
 /// Announces an event of the widget to screen readers.

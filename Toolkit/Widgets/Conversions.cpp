@@ -4,6 +4,7 @@
 #include "Toolkit/Widgets/Conversions.h"
 
 #include "Platform/PrintableText.h"
+#include "Toolkit/Widgets/TabularDigits.h"
 
 #include <algorithm>
 #include <cmath>
@@ -34,6 +35,7 @@ QFont toQt(const Font& font) {
     // 72nd.
     result.setPointSizeF(std::max(font.size(), 1.0) * 72 / 96);
     result.setBold(font.isBold());
+    useTabularDigits(result);
     return result;
 }
 

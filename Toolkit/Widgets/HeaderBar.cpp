@@ -20,6 +20,7 @@ namespace velmora {
 namespace {
 
 constexpr int chevronWidth = 22;
+constexpr int leastHeight = 52;
 
 } // namespace
 
@@ -44,16 +45,21 @@ void BackButton::paintEvent(QPaintEvent* /*event*/) {
         painter.fillRect(rect(), ground);
     }
     const double middle = height() / 2.0;
+    const bool isMirrored = isRightToLeft();
+    const auto x = [&](double left) { return isMirrored ? width() - left : left; };
     QPainterPath chevron;
-    chevron.moveTo(14, middle - 7);
-    chevron.lineTo(7, middle);
-    chevron.lineTo(14, middle + 7);
+    chevron.moveTo(x(14), middle - 7);
+    chevron.lineTo(x(7), middle);
+    chevron.lineTo(x(14), middle + 7);
     painter.setRenderHint(QPainter::Antialiasing);
     painter.setPen(QPen(ink, 2, Qt::SolidLine, Qt::RoundCap, Qt::RoundJoin));
     painter.drawPath(chevron);
     painter.setPen(ink);
-    const QRect room = rect().adjusted(chevronWidth, 0, -4, 0);
-    painter.drawText(room, static_cast<int>(Qt::AlignLeft | Qt::AlignVCenter) | Qt::TextSingleLine,
+    const QRect room = QStyle::visualRect(layoutDirection(), rect(), rect().adjusted(chevronWidth, 0, -4, 0));
+    const Qt::Alignment side = isMirrored ? Qt::AlignRight : Qt::AlignLeft;
+    painter.drawText(room,
+                     static_cast<int>(side | Qt::AlignAbsolute | Qt::AlignVCenter) | Qt::TextSingleLine |
+                         (text().isRightToLeft() ? Qt::TextForceRightToLeft : Qt::TextForceLeftToRight),
                      QFontMetricsF(font()).elidedText(escapedLine(text()), Qt::ElideRight, room.width()));
     if (hasFocus()) {
         QStyleOptionFocusRect option;
@@ -120,6 +126,8 @@ HeaderBar::HeaderBar()
     _title->setFont(toQt(Font::boldSystemFontOfSize(17)));
     _title->setAlignment(Qt::AlignCenter);
     _title->setElideMode(Qt::ElideMiddle);
+    _title->setMaximumLines(2);
+    _title->setHeading(true);
     _back->hide();
     _command->hide();
 }
@@ -144,6 +152,12 @@ void HeaderBar::setBack(bool isShown, const QString& title) {
     layoutParts();
 }
 
+int HeaderBar::fitWidth(int width) {
+    resize(width, height());
+    layoutParts();
+    return std::max(leastHeight, _title->heightForWidth(_title->width()) + 8);
+}
+
 void HeaderBar::layoutParts() {
     // The way back has a third of the bar at most. The title is in the bar's middle when it fits there,
     // beside the way back otherwise.
@@ -158,6 +172,8 @@ void HeaderBar::layoutParts() {
     const int middle = (width() - wanted) / 2;
     const bool fits = middle >= std::max(left, right);
     _title->setGeometry(fits ? middle : left, 0, fits ? wanted : room, height());
+    for (QWidget* const part : findChildren<QWidget*>(Qt::FindDirectChildrenOnly))
+        part->setGeometry(QStyle::visualRect(layoutDirection(), rect(), part->geometry()));
 }
 
 void HeaderBar::paintEvent(QPaintEvent* /*event*/) {
@@ -169,6 +185,12 @@ void HeaderBar::paintEvent(QPaintEvent* /*event*/) {
 
 void HeaderBar::resizeEvent(QResizeEvent* /*event*/) {
     layoutParts();
+}
+
+void HeaderBar::changeEvent(QEvent* event) {
+    QWidget::changeEvent(event);
+    if (event->type() == QEvent::LayoutDirectionChange)
+        layoutParts();
 }
 
 } // namespace velmora

@@ -47,10 +47,13 @@ public:
     [[nodiscard]] HeaderButton& commandButton() { return *_command; }
     /// Shows a button of that title; none for an empty one.
     void setCommand(const QString& title);
+    /// Takes that width, and returns the height that the title needs in it.
+    [[nodiscard]] int fitWidth(int width);
 
 protected:
     void paintEvent(QPaintEvent* event) override;
     void resizeEvent(QResizeEvent* event) override;
+    void changeEvent(QEvent* event) override;
 
 private:
     void layoutParts();

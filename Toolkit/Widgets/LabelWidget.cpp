@@ -5,10 +5,13 @@
 
 #include "Toolkit/Widgets/Conversions.h"
 #include "Toolkit/Widgets/Tables/CellWidget.h"
+#include "Toolkit/Widgets/TextLines.h"
 
 #include <QFontMetricsF>
 #include <QPainter>
+#include <QStyle>
 
+#include <algorithm>
 #include <cmath>
 
 namespace velmora {
@@ -28,6 +31,17 @@ void LabelWidget::setElideMode(Qt::TextElideMode mode) {
     update();
 }
 
+void LabelWidget::setMaximumLines(int lines) {
+    _maximumLines = lines;
+    update();
+}
+
+int LabelWidget::heightForWidth(int width) const {
+    const qsizetype lines = linesOfText(escapedLine(text()), font(), width, _maximumLines, _elideMode).size();
+    return static_cast<int>(
+        std::ceil(static_cast<double>(std::max<qsizetype>(lines, 1)) * QFontMetricsF(font()).height()));
+}
+
 QSize LabelWidget::sizeHint() const {
     const QFontMetricsF metrics(font());
     return {static_cast<int>(std::ceil(metrics.horizontalAdvance(escapedLine(text())))),
@@ -39,10 +53,7 @@ QSize LabelWidget::minimumSizeHint() const {
 }
 
 QString LabelWidget::shownText() const {
-    const QFontMetricsF metrics(font());
-    const QString whole = escapedLine(text());
-    return metrics.horizontalAdvance(whole) <= width() ? whole
-                                                       : metrics.elidedText(whole, _elideMode, width());
+    return linesOfText(escapedLine(text()), font(), width(), _maximumLines, _elideMode).join(u'\n');
 }
 
 QColor LabelWidget::shownColor() const {
@@ -56,7 +67,23 @@ QColor LabelWidget::shownColor() const {
 void LabelWidget::paintEvent(QPaintEvent* /*event*/) {
     QPainter painter(this);
     painter.setPen(shownColor());
-    painter.drawText(rect(), static_cast<int>(alignment()) | Qt::TextSingleLine, shownText());
+    const QStringList lines = shownText().split(u'\n');
+    // The layout decides about the side, the text about the order: what the modem reports is not turned
+    // around.
+    const bool isTurned = text().isRightToLeft();
+    const int place = static_cast<int>(QStyle::visualAlignment(layoutDirection(), alignment())) |
+                      static_cast<int>(Qt::AlignAbsolute) | Qt::TextSingleLine |
+                      (isTurned ? Qt::TextForceRightToLeft : Qt::TextForceLeftToRight);
+    if (lines.size() == 1) {
+        painter.drawText(rect(), place, lines.front());
+        return;
+    }
+    const double line = QFontMetricsF(font()).height();
+    double top = (height() - line * static_cast<double>(lines.size())) / 2;
+    for (const QString& each : lines) {
+        painter.drawText(QRectF(0, top, width(), line), place, each);
+        top += line;
+    }
 }
 
 } // namespace velmora

@@ -55,6 +55,11 @@ double NavigationView::heightOf(const View& accessory) const {
                                       : accessory.frame().height;
 }
 
+void NavigationView::fitHeader() {
+    if (_header->fitWidth(static_cast<int>(std::lround(bounds().width))) != _header->height())
+        layoutSubviews();
+}
+
 void NavigationView::showPane(View& pane, View* old, bool isPush, bool animated,
                               std::function<void()> atEnd) {
     finish();
@@ -93,9 +98,10 @@ void NavigationView::finish() {
 /// The upper one of the two travels the entire width, the lower one a third of it.
 void NavigationView::placePane(double part) const {
     const double width = bounds().width;
-    const auto put = [](const View* view, double x) {
+    const double side = widget()->isRightToLeft() ? -1 : 1;
+    const auto put = [side](const View* view, double x) {
         if (view)
-            view->widget()->move(static_cast<int>(std::lround(x)), 0);
+            view->widget()->move(static_cast<int>(std::lround(side * x)), 0);
     };
     put(_pane, _isPush ? width * (1 - part) : width / 3 * (part - 1));
     put(_old, _isPush ? width / 3 * -part : width * part);
@@ -105,7 +111,8 @@ void NavigationView::layoutSubviews() {
     finish();
     const double below = _toolbar->isHidden() ? 0 : barHeight;
     const auto whole = [](double value) { return static_cast<int>(std::lround(value)); };
-    _header->setGeometry(0, 0, whole(bounds().width), whole(barHeight));
+    const double header = _header->fitWidth(whole(bounds().width));
+    _header->setGeometry(0, 0, whole(bounds().width), whole(header));
     _toolbar->setGeometry(0, whole(bounds().height - below), whole(bounds().width), whole(barHeight));
     double bottom = bounds().height - below;
     for (auto view = _accessories.rbegin(); view != _accessories.rend(); ++view) {
@@ -113,12 +120,12 @@ void NavigationView::layoutSubviews() {
         bottom -= height;
         (*view)->setFrame({0, bottom, bounds().width, height});
     }
-    const double room = std::max(bottom - barHeight, 0.0);
+    const double room = std::max(bottom - header, 0.0);
     // However long its text, the notice leaves half of the room to the pane.
     const double notice =
         _notice->isHidden() ? 0 : std::min<double>(_notice->heightForWidth(whole(bounds().width)), room / 2);
-    _notice->setGeometry(0, whole(barHeight), whole(bounds().width), whole(notice));
-    _container.setFrame({0, barHeight + notice, bounds().width, room - notice});
+    _notice->setGeometry(0, whole(header), whole(bounds().width), whole(notice));
+    _container.setFrame({0, header + notice, bounds().width, room - notice});
     if (_pane)
         _pane->setFrame(_container.bounds());
 }

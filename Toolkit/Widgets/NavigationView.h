@@ -27,6 +27,8 @@ public:
     /// Shows the views between pane and toolbar, the first on top: as high as they are, or as their widgets
     /// want to be at the width.
     void setAccessories(const std::vector<View*>& views);
+    /// The header has another title, which may need another height.
+    void fitHeader();
 
     /// Replaces the old pane (there may be none): sliding in from the right for a push, uncovered from the
     /// left otherwise. An earlier animation ends first.

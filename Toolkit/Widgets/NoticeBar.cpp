@@ -9,6 +9,7 @@
 
 #include <QPainter>
 #include <QPushButton>
+#include <QStyle>
 
 #include <algorithm>
 
@@ -84,6 +85,8 @@ void NoticeBar::resizeEvent(QResizeEvent* /*event*/) {
         _text->setGeometry(room.adjusted(0, 0, 0, -buttonHeight - marginAbove));
         _button->setGeometry(room.left(), room.bottom() + 1 - buttonHeight, room.width(), buttonHeight);
     }
+    for (QWidget* const part : {static_cast<QWidget*>(_text), static_cast<QWidget*>(_button)})
+        part->setGeometry(QStyle::visualRect(layoutDirection(), rect(), part->geometry()));
 }
 
 void NoticeBar::paintEvent(QPaintEvent* /*event*/) {

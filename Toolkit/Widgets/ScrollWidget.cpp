@@ -3,6 +3,7 @@
 
 #include "Toolkit/Widgets/ScrollWidget.h"
 
+#include "Toolkit/Widgets/ScrollSigns.h"
 #include "Toolkit/Widgets/Tables/TableWidget.h"
 #include "Toolkit/Widgets/TouchScroll.h"
 
@@ -16,7 +17,7 @@
 
 namespace velmora {
 
-ScrollWidget::ScrollWidget() : _content(new QWidget(this)) {}
+ScrollWidget::ScrollWidget() : _content(new QWidget(this)), _signs(new ScrollSigns(*this, *_content)) {}
 
 void ScrollWidget::setContentSize(const QSizeF& size) {
     _size = size;
@@ -27,11 +28,23 @@ void ScrollWidget::setContentSize(const QSizeF& size) {
 
 void ScrollWidget::setOffset(double x) {
     _offset = std::clamp(x, 0.0, maximumOffset());
-    _content->move(-static_cast<int>(std::round(_offset)), 0);
+    const int moved = static_cast<int>(std::round(_offset));
+    _content->move(isRightToLeft() ? width() - _content->width() + moved : -moved, 0);
+    _signs->setGeometry(rect());
+    _signs->setVisible(maximumOffset() > 0);
+    _signs->update();
 }
 
 double ScrollWidget::maximumOffset() const {
     return std::max(_size.width() - width(), 0.0);
+}
+
+double ScrollWidget::position() const {
+    return isRightToLeft() ? maximumOffset() - _offset : _offset;
+}
+
+void ScrollWidget::setPosition(double x) {
+    setOffset(isRightToLeft() ? maximumOffset() - x : x);
 }
 
 ScrollWidget* ScrollWidget::at(const QWidget& ancestor, const QPoint& place) {
@@ -48,12 +61,12 @@ bool ScrollWidget::event(QEvent* event) {
         auto* const prepare = static_cast<QScrollPrepareEvent*>(event);
         prepare->setViewportSize(size());
         prepare->setContentPosRange({0, 0, maximumOffset(), 0});
-        prepare->setContentPos({_offset, 0});
+        prepare->setContentPos({position(), 0});
         prepare->accept();
         return true;
     }
     if (event->type() == QEvent::Scroll) {
-        setOffset(static_cast<QScrollEvent*>(event)->contentPos().x());
+        setPosition(static_cast<QScrollEvent*>(event)->contentPos().x());
         return true;
     }
     const bool isTouch = event->type() == QEvent::TouchBegin || event->type() == QEvent::TouchUpdate ||
@@ -76,12 +89,18 @@ void ScrollWidget::wheelEvent(QWheelEvent* event) {
         event->ignore();
         return;
     }
-    setOffset(_offset - distance);
+    setPosition(position() - distance);
     event->accept();
 }
 
 void ScrollWidget::resizeEvent(QResizeEvent* /*event*/) {
     setOffset(_offset);
+}
+
+void ScrollWidget::changeEvent(QEvent* event) {
+    QWidget::changeEvent(event);
+    if (event->type() == QEvent::LayoutDirectionChange)
+        setOffset(_offset);
 }
 
 void ScrollWidget::showEvent(QShowEvent* /*event*/) {

@@ -22,6 +22,7 @@ namespace velmora {
 
 Toolbar::Toolbar() : _layout(new QHBoxLayout(this)) {
     setObjectName("velmora.toolbar");
+    setAccessibleName(tr("Status"));
     setAutoFillBackground(true);
     _layout->setContentsMargins(12, 1, 12, 0);
     _layout->setSpacing(8);
@@ -89,6 +90,7 @@ QWidget* Toolbar::makeWidget(Kind kind) {
     case Kind::label: {
         auto* const label = new LabelWidget;
         label->setObjectName("velmora.status");
+        label->setElideMode(Qt::ElideLeft); // the time, at its end, is what changes
         label->setSizePolicy(QSizePolicy::Preferred, QSizePolicy::Preferred);
         return label;
     }

@@ -60,7 +60,8 @@ WindowWidget* WindowWidget::main() {
 
 bool WindowWidget::isBackOrCancel(const QKeyEvent& event) {
     return event.key() == Qt::Key_Back || event.matches(QKeySequence::Cancel) ||
-           (event.key() == Qt::Key_Left && event.modifiers() == Qt::AltModifier);
+           (event.key() == (QGuiApplication::isRightToLeft() ? Qt::Key_Right : Qt::Key_Left) &&
+            event.modifiers() == Qt::AltModifier);
 }
 
 void WindowWidget::checkPainted() {

@@ -4,6 +4,7 @@
 #include "Toolkit/Widgets/WrappedLabel.h"
 
 #include <QPainter>
+#include <QStyle>
 #include <QTextLayout>
 
 #include <algorithm>
@@ -20,9 +21,11 @@ QString WrappedLabel::brokenText() const {
     return text().replace(QStringLiteral("--"), "-" + wordJoiner + "-" + wordJoiner);
 }
 
-double WrappedLabel::breakLines(QTextLayout& layout, int width) {
+double WrappedLabel::breakLines(QTextLayout& layout, int width) const {
     QTextOption option;
     option.setWrapMode(QTextOption::WrapAtWordBoundaryOrAnywhere);
+    option.setTextDirection(text().isRightToLeft() ? Qt::RightToLeft : Qt::LeftToRight);
+    option.setAlignment(QStyle::visualAlignment(layoutDirection(), alignment()) | Qt::AlignAbsolute);
     layout.setTextOption(option);
     layout.beginLayout();
     double height = 0;

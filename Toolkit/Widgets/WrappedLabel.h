@@ -24,7 +24,7 @@ private:
     /// The text as it is broken: never after the dashes of an option in a command.
     [[nodiscard]] QString brokenText() const;
     /// Breaks the lines of `layout`, which has the text, and returns their height.
-    static double breakLines(QTextLayout& layout, int width);
+    double breakLines(QTextLayout& layout, int width) const;
 };
 
 } // namespace velmora

@@ -4,6 +4,7 @@
 #include "Toolkit/Widgets/Tables/CellWidget.h"
 
 #include "Toolkit/Widgets/Accessibility.h"
+#include "Toolkit/Widgets/Contrast.h"
 
 #include <QPainter>
 #include <QPainterPath>
@@ -70,7 +71,7 @@ void CellWidget::paintEvent(QPaintEvent* /*event*/) {
     const double hair = 1 / devicePixelRatioF();
     QColor line = palette().color(QPalette::Text);
     line.setAlphaF(0.18F);
-    painter.fillRect(QRectF(10, height() - hair, width() - 10, hair), line);
+    painter.fillRect(QRectF(isRightToLeft() ? 0 : 10, height() - hair, width() - 10, hair), line);
     paintAccessory(painter);
     if (_hasFocusFrame) {
         QStyleOptionFocusRect option;
@@ -86,20 +87,27 @@ void CellWidget::paintAccessory(QPainter& painter) const {
     if (!cell || cell->accessory() == TableCellAccessory::none)
         return;
     const double middle = height() / 2.0;
-    const double left = width() - accessoryWidth(cell->accessory()) + 10;
+    const bool isMirrored = isRightToLeft();
+    const double left = isMirrored ? accessoryWidth(cell->accessory()) - 27
+                                   : width() - accessoryWidth(cell->accessory()) + 10;
     QPainterPath path;
     QPalette::ColorRole role = QPalette::PlaceholderText;
     if (cell->accessory() == TableCellAccessory::disclosureIndicator) {
-        path.moveTo(left + 1, middle - 6);
-        path.lineTo(left + 7, middle);
-        path.lineTo(left + 1, middle + 6);
+        // It points to where the list comes in from; a check mark is the same everywhere.
+        const double tip = isMirrored ? left + 10 : left + 7;
+        const double back = isMirrored ? tip + 6 : tip - 6;
+        path.moveTo(back, middle - 6);
+        path.lineTo(tip, middle);
+        path.lineTo(back, middle + 6);
     } else {
         path.moveTo(left + 1, middle);
         path.lineTo(left + 6, middle + 5);
         path.lineTo(left + 16, middle - 7);
         role = QPalette::Highlight;
     }
-    const QColor color = palette().color(isHighlighted() ? QPalette::HighlightedText : role);
+    const QColor color = isHighlighted() ? palette().color(QPalette::HighlightedText)
+                                         : markColor(palette().color(role), palette().color(QPalette::Base),
+                                                     palette().color(QPalette::Text));
     painter.setRenderHint(QPainter::Antialiasing);
     painter.setPen(QPen(color, 2, Qt::SolidLine, Qt::RoundCap, Qt::RoundJoin));
     painter.drawPath(path);

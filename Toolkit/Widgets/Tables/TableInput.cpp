@@ -69,7 +69,7 @@ bool TableInput::handle(QEvent* event) {
         prepare->setViewportSize(_table.viewport()->size());
         prepare->setContentPosRange({0, 0, _underTouch ? _underTouch->maximumOffset() : 0,
                                      static_cast<double>(_table.verticalScrollBar()->maximum())});
-        prepare->setContentPos({_underTouch ? _underTouch->offset() : 0,
+        prepare->setContentPos({_underTouch ? _underTouch->position() : 0,
                                 static_cast<double>(_table.verticalScrollBar()->value())});
         prepare->accept();
         return true;
@@ -79,7 +79,7 @@ bool TableInput::handle(QEvent* event) {
         cancelPress();
         const QPointF place = static_cast<QScrollEvent*>(event)->contentPos();
         if (_underTouch)
-            _underTouch->setOffset(place.x());
+            _underTouch->setPosition(place.x());
         _table.verticalScrollBar()->setValue(static_cast<int>(std::round(place.y())));
         return true;
     }
@@ -193,7 +193,7 @@ bool TableInput::scrollSideways(int direction) {
     for (QWidget* const child : cell->findChildren<QWidget*>())
         if (auto* const scroller = dynamic_cast<ScrollWidget*>(child);
             scroller && scroller->maximumOffset() > 0) {
-            scroller->setOffset(scroller->offset() + direction * sidewaysStep);
+            scroller->setPosition(scroller->position() + direction * sidewaysStep);
             return true;
         }
     return false;

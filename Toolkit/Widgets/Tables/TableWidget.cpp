@@ -7,14 +7,17 @@
 #include "Toolkit/Tables/TableView.h"
 #include "Toolkit/Widgets/Accessibility.h"
 #include "Toolkit/Widgets/Conversions.h"
+#include "Toolkit/Widgets/OverlayScrollBar.h"
 #include "Toolkit/Widgets/ScrollWidget.h"
 #include "Toolkit/Widgets/Tables/CellWidget.h"
+#include "Toolkit/Widgets/Tables/EmptyLabel.h"
 
 #include <QContextMenuEvent>
 #include <QFocusEvent>
 #include <QFontMetricsF>
 #include <QMenu>
 #include <QPointer>
+#include <QResizeEvent>
 #include <QScrollBar>
 
 #include <algorithm>
@@ -23,7 +26,7 @@
 
 namespace velmora {
 
-TableWidget::TableWidget() : _input(*this) {
+TableWidget::TableWidget() : _emptyLabel(new EmptyLabel(*viewport())), _input(*this) {
     setObjectName("velmora.table");
     setFrameShape(QFrame::NoFrame);
     setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
@@ -32,6 +35,7 @@ TableWidget::TableWidget() : _input(*this) {
     viewport()->setAutoFillBackground(true);
     viewport()->setForegroundRole(QPalette::Text);
     viewport()->setAttribute(Qt::WA_AcceptTouchEvents);
+    new OverlayScrollBar(*this);
 }
 
 TableWidget::~TableWidget() = default;
@@ -53,6 +57,7 @@ void TableWidget::reload() {
         for (std::size_t section = 0; section < counts.size(); ++section)
             counts[section] = dataSource->numberOfRowsInSection(*view, section);
     }
+    const std::size_t before = _rows.total();
     const IndexPath selected = _rows.path(_selected);
     const IndexPath focus = _rows.path(_focus);
     _rows = TableRows(std::move(counts));
@@ -69,6 +74,9 @@ void TableWidget::reload() {
         _focus = focus.isNull() ? 0 : _rows.total() - 1;
     updateScrollRange();
     layoutRows();
+    showEmptyLabel();
+    if (_rows.total() != before)
+        announce(*this, QAccessible::ObjectReorder);
     for (const auto& [row, cell] : _cells)
         static_cast<CellWidget*>(cell->widget())->announceName();
     if (_rows.path(_focus) != focus)
@@ -93,6 +101,10 @@ std::shared_ptr<TableCell> TableWidget::dequeue(std::string_view identifier) {
 CellWidget* TableWidget::cellWidget(std::optional<std::size_t> row) const {
     const auto found = row ? _cells.find(*row) : _cells.end();
     return found == _cells.end() ? nullptr : static_cast<CellWidget*>(found->second->widget());
+}
+
+void TableWidget::showEmptyLabel() {
+    _emptyLabel->setWanted(_isLoaded && _rows.total() == 0);
 }
 
 int TableWidget::rowHeight() const {
@@ -252,6 +264,10 @@ void TableWidget::resizeEvent(QResizeEvent* event) {
     QAbstractScrollArea::resizeEvent(event);
     updateScrollRange();
     layoutRows();
+    showEmptyLabel();
+    // An on-screen keyboard, say, has taken the room in which it was.
+    if (_focus && _showsFocus && hasFocus() && event->size().height() < event->oldSize().height())
+        scrollToRow(*_focus);
 }
 
 void TableWidget::showEvent(QShowEvent* event) {

@@ -17,6 +17,7 @@
 namespace velmora {
 
 class CellWidget;
+class EmptyLabel;
 class TableCell;
 class TableView;
 class TableViewDataSource;
@@ -43,6 +44,9 @@ public:
     [[nodiscard]] const TableRows& rows() const { return _rows; }
     [[nodiscard]] const std::map<std::size_t, std::shared_ptr<TableCell>>& cells() const { return _cells; }
     [[nodiscard]] CellWidget* cellWidget(std::optional<std::size_t> row) const;
+    [[nodiscard]] EmptyLabel& emptyLabel() const { return *_emptyLabel; }
+    /// Shows or hides it.
+    void showEmptyLabel();
     [[nodiscard]] int rowHeight() const;
     /// In the viewport.
     [[nodiscard]] QRect rowRect(std::size_t row) const;
@@ -83,6 +87,7 @@ private:
     void updateMarks();
     void announceFocus();
 
+    EmptyLabel* _emptyLabel;
     TableRows _rows;
     std::map<std::size_t, std::shared_ptr<TableCell>> _cells;
     ReuseQueue _queue;
