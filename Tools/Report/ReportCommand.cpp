@@ -27,8 +27,8 @@ namespace {
 
 constexpr mode_t newFileMode = S_IRUSR | S_IWUSR;
 
-/// What the page calls the files: their names without directories, which say more than a page is to tell;
-/// numbered where several are the same.
+/// The names of the files on the page: without directories, which are private; numbered where several are the
+/// same.
 std::vector<std::string> shownNames(const std::vector<std::string>& files) {
     std::vector<std::string> names;
     for (const std::string& file : files) {

@@ -91,9 +91,34 @@ void writeChart(Markup& out, const DriveReport& report, ReportChart chart, const
     out.raw("</svg></figure>\n");
 }
 
+/// The style's class of a band's value: classes of levels have colours of their own.
+void writeBandClass(Markup& out, const StateBand& band, std::uint32_t value) {
+    out.raw("class=\"");
+    if (band.name() == "level class" && value != StateBand::several)
+        out.raw("c-").text(band.values()[value]);
+    else
+        out.raw("b-").number(value == StateBand::several ? 1 : 2 + (value - 2) % 8);
+    out.raw("\"");
+}
+
+/// Of a band of few values; of many the colours repeat.
+void writeBandLegend(Markup& out, const StateBand& band) {
+    constexpr std::size_t most = 10;
+    if (band.values().size() > most)
+        return;
+    out.raw("<ul class=\"legend\">");
+    for (std::uint32_t value = 2; value < band.values().size(); ++value) {
+        out.raw("<li><svg width=\"14\" height=\"10\" aria-hidden=\"true\"><rect ");
+        writeBandClass(out, band, value);
+        out.raw(" width=\"14\" height=\"10\"/></svg> ").text(band.values()[value]).raw("</li>");
+    }
+    out.raw("</ul>");
+}
+
 /// The band in columns, each with the value in its middle; neighbours of one value are one rectangle.
 void writeBand(Markup& out, const StateBand& band, const TimeAxis& axis) {
     out.raw("<figure class=\"band\"><figcaption>").text(band.name());
+    writeBandLegend(out, band);
     out.raw("</figcaption><svg class=\"plot\" viewBox=\"0 0 1000 16\" role=\"img\" aria-label=\"");
     out.text(band.name()).raw(" over time\">");
     std::size_t step = 0;
@@ -103,7 +128,9 @@ void writeBand(Markup& out, const StateBand& band, const TimeAxis& axis) {
     const auto writeOne = [&](double end) {
         if (value == StateBand::unknown || end <= begin)
             return;
-        out.raw("<rect class=\"b-").number(value % 10).raw("\" x=\"").point(begin).raw("\" width=\"");
+        out.raw("<rect ");
+        writeBandClass(out, band, value);
+        out.raw(" x=\"").point(begin).raw("\" width=\"");
         out.point(end - begin).raw("\" height=\"").point(bandHeight).raw("\"><title>");
         out.text(band.values()[value]).raw("</title></rect>");
     };

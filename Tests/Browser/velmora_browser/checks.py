@@ -1,6 +1,6 @@
 # SPDX-FileCopyrightText: 2026 Velmora contributors
 # SPDX-License-Identifier: MIT
-"""What holds for a page in a browser. Each check returns what is wrong, in words."""
+"""What holds for a page in a browser. Each check returns the errors that it finds."""
 
 import time
 from collections.abc import Callable, Iterator

@@ -8,7 +8,7 @@
 
 namespace velmora {
 
-/// What is not right with a report's page as HTML; empty where all is. A page has the elements and attributes
+/// The first error of a report's page as HTML; empty for none. A page has the elements and attributes
 /// that our own markup has and no others, nested, two scripts, and JSON in the first.
 [[nodiscard]] std::string problemOfPage(std::string_view page);
 /// The same of a text as JSON.
