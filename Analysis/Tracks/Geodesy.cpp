@@ -24,7 +24,7 @@ struct Point {
     double z = 0;
 };
 
-Point pointOf(const Place& place) {
+Point pointOf(const Coordinates& place) {
     const double latitude = place.latitude * radiansOfDegree;
     const double longitude = place.longitude * radiansOfDegree;
     const double sine = std::sin(latitude);
@@ -34,7 +34,7 @@ Point pointOf(const Place& place) {
 }
 
 /// The place that the line from the Earth's centre through the point leads to.
-Place placeOf(const Point& point) {
+Coordinates placeOf(const Point& point) {
     // A point on the ellipsoid has tan(latitude) = z / ((1 - e^2) p). One a little below, as those of chords
     // are, is moved out to it along the line from the centre.
     const double latitude = std::atan2(point.z, (1 - eccentricitySquared) * std::hypot(point.x, point.y));
@@ -46,7 +46,7 @@ Place placeOf(const Point& point) {
 
 } // namespace
 
-double distance_m(const Place& from, const Place& to) {
+double distance_m(const Coordinates& from, const Coordinates& to) {
     const Point a = pointOf(from);
     const Point b = pointOf(to);
     const double chord = std::hypot(a.x - b.x, a.y - b.y, a.z - b.z);
@@ -54,7 +54,7 @@ double distance_m(const Place& from, const Place& to) {
     return diameter * std::asin(std::min(chord / diameter, 1.0));
 }
 
-Place placeBetween(const Place& from, const Place& to, double part) {
+Coordinates placeBetween(const Coordinates& from, const Coordinates& to, double part) {
     const Point a = pointOf(from);
     const Point b = pointOf(to);
     return placeOf({std::lerp(a.x, b.x, part), std::lerp(a.y, b.y, part), std::lerp(a.z, b.z, part)});

@@ -28,7 +28,7 @@ std::optional<double> larger(std::optional<double> before, std::optional<double>
     return before && after ? std::optional(std::max(*before, *after)) : std::nullopt;
 }
 
-Place placeOf(const Fix& fix) {
+Coordinates placeOf(const Fix& fix) {
     return {fix.latitude, fix.longitude};
 }
 
@@ -40,7 +40,7 @@ Position positionBetween(const Fix& before, const Fix& after, Time time) {
     if (time == after.time)
         return {after, {}};
     const double part = std::chrono::duration<double>(time - before.time) / (after.time - before.time);
-    const Place place = placeBetween(placeOf(before), placeOf(after), part);
+    const Coordinates place = placeBetween(placeOf(before), placeOf(after), part);
     Position position;
     position.age = time - before.time;
     Fix& fix = position.fix;

@@ -13,10 +13,10 @@ namespace {
 /// Geodesics on WGS 84 by Vincenty's direct solution: where one that begins at a place leads.
 struct Geodesic {
     const char* name;
-    Place from;
+    Coordinates from;
     double length_m;
-    Place middle; ///< after half of it; only where `length_m` is 50
-    Place to;
+    Coordinates middle; ///< after half of it; only where `length_m` is 50
+    Coordinates to;
 };
 
 constexpr Geodesic geodesics[] = {
