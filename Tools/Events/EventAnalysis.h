@@ -19,6 +19,7 @@ public:
     void report(const MessageReport& report) override { _engine.report(report); }
     void reportUndecoded(const UndecodedReport& report) override;
     void reportLoss(const InputLoss& loss) override { _engine.damaged(loss.at, loss.reason); }
+    void reportNote(const InputNote& note) override { _engine.noted(note.at, note.text); }
     void interrupt() override { _engine.interrupt(); }
     void finish() override { _engine.finish(); }
 
