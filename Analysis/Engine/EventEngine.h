@@ -35,6 +35,8 @@ public:
     /// The reader of the input found damage, such as a record of the file that is not whole, before the
     /// message of that number. Messages may be missing: what was known is not valid any more.
     void damaged(MessageNumber message, std::string_view reason);
+    /// The recording has a comment on that message, which is the latest one reported.
+    void noted(MessageNumber message, std::string_view text) { _checks.noted(message, text); }
     /// The connection that messages come by was lost: as damage, but no event.
     void interrupt();
     /// The input has ended.

@@ -99,4 +99,10 @@ void RecordingChecks::damaged(MessageNumber message, std::string_view reason) {
     malformed(_last ? _last->time : Time(), message, reason, std::nullopt);
 }
 
+void RecordingChecks::noted(MessageNumber message, std::string_view text) {
+    Event event = newEvent("note", _last ? _last->time : Time(), message);
+    event.text = text;
+    _sink.happened(event);
+}
+
 } // namespace velmora

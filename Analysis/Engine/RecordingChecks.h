@@ -30,6 +30,8 @@ public:
     void report(const MessageReport& report);
     /// The reader of the input found damage before that message.
     void damaged(MessageNumber message, std::string_view reason);
+    /// The recording has a comment on that message, which is the latest.
+    void noted(MessageNumber message, std::string_view text);
     void finish() { _last.reset(); }
 
     /// Absent before the first message, and after the end of the input.

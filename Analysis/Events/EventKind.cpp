@@ -21,7 +21,7 @@ constexpr bool derived = false;
 constexpr bool ofRule = true;
 constexpr bool builtIn = false;
 
-constexpr std::array<EventKindRow, 32> rows{{
+constexpr std::array<EventKindRow, 33> rows{{
     {CellReselection, "cell-reselection", Info, once, derived, builtIn, "the phone moved to another cell"},
     {Handover, "handover", Info, once, derived, builtIn, "the network moved the phone to another cell"},
     {CellChange, "cell-change", Info, once, stated, builtIn, "another serving cell; by whom is not known"},
@@ -54,6 +54,7 @@ constexpr std::array<EventKindRow, 32> rows{{
     {Gap, "gap", Warning, lasts, stated, builtIn, "no message for more than 30 s"},
     {Malformed, "malformed", Warning, once, stated, builtIn, "a message, or what holds it, is malformed"},
     {ClockJump, "clock-jump", Warning, once, stated, builtIn, "the clock went back, or leapt ahead"},
+    {Note, "note", Info, once, stated, builtIn, "a comment on a message of the recording"},
     {WeakCoverage, "weak-coverage", Warning, lasts, derived, ofRule, "the level of the serving cell is low"},
     {PoorQuality, "poor-quality", Warning, lasts, derived, ofRule, "the quality of the serving cell is low"},
     {PilotPollution, "pilot-pollution", Warning, lasts, derived, ofRule,

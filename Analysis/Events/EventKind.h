@@ -38,6 +38,7 @@ enum class EventKind : std::uint8_t {
     Gap,
     Malformed,
     ClockJump,
+    Note,
     WeakCoverage,
     PoorQuality,
     PilotPollution,

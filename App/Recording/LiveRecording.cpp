@@ -103,8 +103,10 @@ void LiveRecording::check(const Result<Done>& result) {
         return;
     logLine(LogPriority::Error, "recording: " + result.reason());
     _queue.async([this, alive = _isAlive, reason = result.reason()] {
-        if (*alive)
-            _events.ended(reason);
+        if (!*alive)
+            return;
+        const auto ended = _events.ended; // the call destroys this
+        ended(reason);
     });
 }
 

@@ -10,7 +10,7 @@ _velmora_roles=(serving serving.{mcc,mnc,area,cell,channel,physical-cell,level,q
 
 _velmora_kinds=(cell-reselection handover cell-change technology-change ping-pong late-reselection early-reselection
     radio-state registration-state mobility-state area-update out-of-service limited-service call-setup call-end
-    call-lost re-establishment context-up context-down address-change evdo-session sim-change gap malformed clock-jump
+    call-lost re-establishment context-up context-down address-change evdo-session sim-change gap malformed clock-jump note
     weak-coverage poor-quality pilot-pollution missing-neighbour block-error-burst data-stall fer-alarm)
 
 # Offers those of the words that begin as the present one does.

@@ -31,6 +31,30 @@ INSTANTIATE_TEST_SUITE_P(Technologies, VelmoraSelfTest,
                          testing::Values("gsm", "lte", "utran", "c2k", "ifx", "modem"),
                          [](const auto& row) { return std::string(row.param); });
 
+class VelmoraRecordingTest : public VelmoraProcessTest, public testing::WithParamInterface<const char*> {};
+
+TEST_P(VelmoraRecordingTest, OpensEveryScreenOnAFile) {
+    const QString file = QString(VELMORA_SOURCE_DIR "/Tests/Recordings/%1.pcapng").arg(GetParam());
+    const auto app = start("velmora", {"--self-test", "--log", "stderr", "--log-level", "5", file});
+    EXPECT_EQ(exitStatus(*app), 0) << text("velmora.err");
+    EXPECT_THAT(text("velmora.err"),
+                testing::ContainsRegex("<5>Self-test: opened [0-9]+ panes and the save screen"));
+    EXPECT_FALSE(exists("ports/com.velmora.BasebandStateReport.LogChannel")) << "it has connected";
+}
+
+INSTANTIATE_TEST_SUITE_P(Technologies, VelmoraRecordingTest,
+                         testing::Values("gsm", "lte", "utran", "c2k", "ifx", "modem"),
+                         [](const auto& row) { return std::string(row.param); });
+
+TEST_F(VelmoraProcessTest, AFileThatCannotBeOpenedIsBadInput) {
+    const auto app = start("velmora", {path("missing.pcapng")});
+    EXPECT_EQ(exitStatus(*app), 1);
+    EXPECT_EQ(text("velmora.err"), "velmora: " + path("missing.pcapng").toStdString() +
+                                       ": cannot open: No such file or directory\n");
+    const auto wrong = start("velmora", {"--technology", "LTE", path("missing.pcapng")}, "wrong");
+    EXPECT_EQ(exitStatus(*wrong), 2);
+}
+
 class VelmoraSignalTest : public VelmoraProcessTest, public testing::WithParamInterface<int> {};
 
 TEST_P(VelmoraSignalTest, EndsItCleanly) {

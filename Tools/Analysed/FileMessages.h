@@ -49,6 +49,7 @@ private:
     void take(const LoggedMessage& message);
     [[nodiscard]] Technology& at(std::uint32_t index);
     void reportNewLosses(std::uint64_t number);
+    void reportNewNotes(TechnologyFeed& feed);
 
     MessageReader& _reader;
     File _file;
@@ -58,7 +59,8 @@ private:
     TechnologyChoice _choice;
     std::vector<std::string> _known; ///< the file's technologies, where they are known beforehand
     std::vector<Technology> _technologies;
-    std::uint64_t _losses = 0; ///< that have been reported
+    std::uint64_t _losses = 0;   ///< that have been reported
+    std::uint64_t _comments = 0; ///< that have been reported, or are none on messages
     UndecodedMessages _undecoded;
 };
 

@@ -28,6 +28,12 @@ struct InputLoss {
     std::string_view reason;
 };
 
+/// A comment on a message, which is the latest one.
+struct InputNote {
+    MessageNumber at;
+    std::string_view text;
+};
+
 /// What the messages of one technology are passed to, in their order and from file to file.
 class MessageAnalysis {
 public:
@@ -42,6 +48,7 @@ public:
     /// Messages may be missing between the latest one and the next. Passed to the analysis of every
     /// technology, since a lost record's is unknown.
     virtual void reportLoss(const InputLoss& /*loss*/) {}
+    virtual void reportNote(const InputNote& /*note*/) {}
     /// Messages may be missing as well: the connection that they come by was lost.
     virtual void interrupt() {}
     /// There are no more messages.

@@ -21,6 +21,7 @@ public:
     [[nodiscard]] bool wantsRowKeys() const override { return false; }
     void reportUndecoded(const UndecodedReport& report) override;
     void reportLoss(const InputLoss& loss) override { _engine.damaged(loss.at, loss.reason); }
+    void reportNote(const InputNote& note) override { _engine.noted(note.at, note.text); }
     void interrupt() override { _engine.interrupt(); }
     void finish() override { _engine.finish(); }
 

@@ -47,6 +47,16 @@ TEST(EventEngine, DistinguishesAClockThatLeapsAheadFromSilence) {
                                          "100.000 gap: no message for 100.000 s"));
 }
 
+TEST(EventEngine, ReportsANoteAtTheTimeOfItsMessage) {
+    LTEEngine lte;
+    lte.serve(0, 17);
+    lte.serve(2, 17);
+    lte.engine.noted({0, 2}, "the lift");
+    EXPECT_THAT(lte.lines(), ElementsAre("2.000 note: the lift"));
+    EXPECT_EQ(lte.only("note").severity, Severity::Info);
+    EXPECT_THAT(lte.only("note").evidence, ElementsAre(MessageNumber{0, 2}));
+}
+
 TEST(EventEngine, ReportsMalformedMessagesAndTakesNothingFromThem) {
     LTEEngine lte;
     lte.serve(0, 17);

@@ -48,6 +48,7 @@ KINDS = {
     "gap": Kind(STATED),
     "malformed": Kind(STATED, 0.01),
     "clock-jump": Kind(STATED),
+    "note": Kind(STATED),
     "weak-coverage": Kind(DERIVED, 2),
     "poor-quality": Kind(DERIVED, 2),
     "pilot-pollution": Kind(DERIVED, 2),
