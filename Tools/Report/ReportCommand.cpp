@@ -5,12 +5,12 @@
 
 #include "Export/Tracks/TrackCollector.h"
 #include "Platform/Linux/Files/AtomicFile.h"
+#include "Recorder/OverwriteTarget.h"
 #include "Tools/Analysed/AnalysedFiles.h"
 #include "Tools/ExitStatus.h"
 #include "Tools/Log/DecoderLog.h"
 #include "Tools/Output.h"
 #include "Tools/OutputGuard.h"
-#include "Tools/OverwriteTarget.h"
 #include "Tools/Report.h"
 #include "Tools/Report/ReportAnalysis.h"
 #include "Tools/Rules/RuleFiles.h"
