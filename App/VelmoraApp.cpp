@@ -12,6 +12,7 @@
 #include "Toolkit/Screen.h"
 #include "Toolkit/Window.h"
 
+#include <chrono>
 #include <cstddef>
 #include <utility>
 #include <vector>
@@ -26,6 +27,8 @@ constexpr const char* homeScreenDomain = "com.velmora.HomeScreen";
 constexpr const char* showGSMRSSIKey = "LantheShowGSMRSSI";
 constexpr const char* connecting = "Connecting...";
 constexpr char privacyKey = 'M';
+/// How long a notice names a snapshot: time enough to read a path, and to hear it read.
+constexpr std::chrono::seconds snapshotNoticeTime{60};
 constexpr const char* maskedNotice = "Identities are masked. Ctrl-M shows them.";
 
 } // namespace
@@ -111,6 +114,18 @@ void VelmoraApp::closeSaveView() {
         startAnew();
 }
 
+void VelmoraApp::snapshotWritten(const std::string& path) {
+    _hasNewSnapshot = true;
+    _snapshotNotice.setPath(path);
+    updateNotice();
+    _platform->model().queue.after(snapshotNoticeTime, [this, snapshot = ++_snapshots] {
+        if (!_model || snapshot != _snapshots) // shut down, or a later one has its own time
+            return;
+        _snapshotNotice.clear();
+        updateNotice();
+    });
+}
+
 void VelmoraApp::startAnew() {
     const ArrayRef contents = _model->getSaveContents();
     if (allowSaveButton() && contents && !contents->empty() && !std::exchange(_offeredSave, true)) {
@@ -186,7 +201,7 @@ void VelmoraApp::connectionChanged() {
 }
 
 void VelmoraApp::updateNotice() {
-    Notice notice = connectionNotice();
+    Notice notice = _snapshotNotice.before(connectionNotice());
     if (_privacy->isOn())
         notice.text = notice.text.empty() ? maskedNotice : maskedNotice + (" " + notice.text);
     _navController->setNotice(std::move(notice));

@@ -7,6 +7,7 @@
 #include "App/ConnectionNotice.h"
 #include "App/DateFormatter.h"
 #include "App/PrivacySwitch.h"
+#include "App/SnapshotNotice.h"
 #include "Model/VelmoraModel.h"
 #include "Platform/Result.h"
 #include "Toolkit/Application.h"
@@ -73,8 +74,8 @@ public:
     void startAnew();
     /// Whether the application has ended to be started anew.
     [[nodiscard]] bool startsAnew() const { return _startsAnew; }
-    /// The save screen has written a snapshot.
-    void snapshotWritten() { _hasNewSnapshot = true; }
+    /// The save screen has written this snapshot, which a notice names for a while.
+    void snapshotWritten(const std::string& path);
 
     /// Opens the save screen; does nothing while it is open.
     void showSaveView();
@@ -137,6 +138,8 @@ private:
 
     std::function<Result<Done>()> _willConnect;
     ConnectionNotice _notice;
+    SnapshotNotice _snapshotNotice;
+    int _snapshots = 0; ///< written so far
     std::string _loggedProblem;
     bool _startsAnew = false;
     bool _offeredSave = false;    ///< the notice's button has opened the save screen
