@@ -6,6 +6,7 @@
 #include "Model/VelmoraModelNode.h"
 #include "Toolkit/Tables/TableViewController.h"
 
+#include <memory>
 #include <optional>
 #include <string>
 #include <string_view>
@@ -39,7 +40,12 @@ public:
     [[nodiscard]] std::size_t numberOfRowsInSection(TableView& tableView, std::size_t section) override;
     [[nodiscard]] std::shared_ptr<TableCell> cellForRowAtIndexPath(TableView& tableView,
                                                                    const IndexPath& indexPath) override;
+    [[nodiscard]] TableRowSummary summaryOfRowAtIndexPath(TableView& tableView,
+                                                          const IndexPath& indexPath) override;
     void didSelectRowAtIndexPath(TableView& tableView, const IndexPath& indexPath) override;
+
+protected:
+    [[nodiscard]] std::unique_ptr<View> loadView() override;
 
 private:
     /// The row's node. Precondition: there is such a row.
