@@ -17,6 +17,7 @@
 #include "Toolkit/Screen.h"
 #include "Toolkit/Window.h"
 
+#include <chrono>
 #include <cstddef>
 #include <utility>
 #include <vector>
@@ -36,6 +37,8 @@ constexpr char pinKey = 'P';
 constexpr char closeKey = 'W';
 constexpr char recordKey = 'R';
 constexpr char noteKey = 'B';
+/// How long a notice names a snapshot: time enough to read a path, and to hear it read.
+constexpr std::chrono::seconds snapshotNoticeTime{60};
 constexpr const char* maskedNotice = "Identities are masked. Ctrl-M shows them.";
 
 } // namespace
@@ -162,6 +165,18 @@ std::optional<MaskSeal> VelmoraApp::maskSeal() const {
     return _privacy ? _privacy->seal() : std::nullopt;
 }
 
+void VelmoraApp::snapshotWritten(const std::string& path) {
+    _hasNewSnapshot = true;
+    _snapshotNotice.setPath(path);
+    updateNotice();
+    _platform->model().queue.after(snapshotNoticeTime, [this, snapshot = ++_snapshots] {
+        if (!_model || snapshot != _snapshots) // shut down, or a later one has its own time
+            return;
+        _snapshotNotice.clear();
+        updateNotice();
+    });
+}
+
 void VelmoraApp::startAnew() {
     const ArrayRef contents = _model->getSaveContents();
     if (allowSaveButton() && contents && !contents->empty() && !std::exchange(_offeredSave, true)) {
@@ -264,7 +279,7 @@ void VelmoraApp::connectionChanged() {
 }
 
 void VelmoraApp::updateNotice() {
-    Notice notice = _playback ? _playback->notice() : connectionNotice();
+    Notice notice = _snapshotNotice.before(_playback ? _playback->notice() : connectionNotice());
     if (const std::string recorded = _recording->notice(); !recorded.empty())
         notice.text = notice.text.empty() ? recorded : recorded + " " + notice.text;
     if (_privacy->isOn())

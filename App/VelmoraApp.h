@@ -7,6 +7,7 @@
 #include "App/ConnectionNotice.h"
 #include "App/DateFormatter.h"
 #include "App/PrivacySwitch.h"
+#include "App/SnapshotNotice.h"
 #include "Model/VelmoraModel.h"
 #include "Platform/Result.h"
 #include "Toolkit/Application.h"
@@ -98,8 +99,8 @@ public:
     void startAnew();
     /// Whether the application has ended to be started anew.
     [[nodiscard]] bool startsAnew() const { return _startsAnew; }
-    /// The save screen has written a snapshot.
-    void snapshotWritten() { _hasNewSnapshot = true; }
+    /// The save screen has written this snapshot, which a notice names for a while.
+    void snapshotWritten(const std::string& path);
 
     /// Opens the save screen; does nothing while it is open.
     void showSaveView();
@@ -177,6 +178,8 @@ private:
 
     std::function<Result<Done>()> _willConnect;
     ConnectionNotice _notice;
+    SnapshotNotice _snapshotNotice;
+    int _snapshots = 0; ///< written so far
     std::string _loggedProblem;
     bool _beginsWithDrive = false;
     bool _startsAnew = false;

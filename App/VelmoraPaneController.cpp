@@ -33,6 +33,12 @@ constexpr double statusFontSize = 14;
 VelmoraPaneController::VelmoraPaneController(NodeRef node, std::string path, VelmoraApp& app)
     : _nodes(std::move(node)), _keyPath(std::move(path)), _app(app) {}
 
+std::unique_ptr<View> VelmoraPaneController::loadView() {
+    auto view = TableViewController::loadView();
+    static_cast<TableView&>(*view).setEmptyText("Nothing has been reported.");
+    return view;
+}
+
 void VelmoraPaneController::viewWillAppear(bool animated) {
     TableViewController::viewWillAppear(animated);
     resetTitle();
@@ -110,6 +116,15 @@ std::shared_ptr<TableCell> VelmoraPaneController::cellForRowAtIndexPath(TableVie
     return cell;
 }
 
+TableRowSummary VelmoraPaneController::summaryOfRowAtIndexPath(TableView&, const IndexPath& indexPath) {
+    const NodeRef& node = nodeAt(indexPath);
+    if (node->childNodes())
+        return {node->displayName(), TableCellAccessory::disclosureIndicator};
+    const std::string* value = node->value();
+    return {value && !value->empty() ? node->displayName() + ", " + *value : node->displayName(),
+            TableCellAccessory::none};
+}
+
 void VelmoraPaneController::didSelectRowAtIndexPath(TableView& tableView, const IndexPath& indexPath) {
     if (indexPath.isNull())
         return;
@@ -151,6 +166,7 @@ const NodeRef& VelmoraPaneController::nodeAt(const IndexPath& indexPath) const {
 
 void VelmoraPaneController::resetTitle() {
     setTitle(_nodes ? std::string_view(_nodes->displayName()) : std::string_view("Velmora"));
+    tableView().setAccessibleName(title());
 }
 
 } // namespace velmora

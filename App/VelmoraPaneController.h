@@ -6,6 +6,7 @@
 #include "Model/VelmoraModelNode.h"
 #include "Toolkit/Tables/TableViewController.h"
 
+#include <memory>
 #include <optional>
 #include <string>
 #include <string_view>
@@ -40,12 +41,17 @@ public:
     [[nodiscard]] std::size_t numberOfRowsInSection(TableView& tableView, std::size_t section) override;
     [[nodiscard]] std::shared_ptr<TableCell> cellForRowAtIndexPath(TableView& tableView,
                                                                    const IndexPath& indexPath) override;
+    [[nodiscard]] TableRowSummary summaryOfRowAtIndexPath(TableView& tableView,
+                                                          const IndexPath& indexPath) override;
     void didSelectRowAtIndexPath(TableView& tableView, const IndexPath& indexPath) override;
     /// A row with a number can be pinned as a chart of the drive view.
     [[nodiscard]] std::vector<MenuItem> menuForRowAtIndexPath(TableView& tableView,
                                                               const IndexPath& indexPath) override;
     /// Pins the row that the keyboard is on, or takes it off.
     void togglePinOfFocusRow();
+
+protected:
+    [[nodiscard]] std::unique_ptr<View> loadView() override;
 
 private:
     [[nodiscard]] std::string pathOfRow(const IndexPath& indexPath) const;

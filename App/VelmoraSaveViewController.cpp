@@ -23,6 +23,7 @@ namespace {
 
 constexpr const char* cellIdentifier = "SaveHistoryContentCell";
 constexpr double cellFontSize = 13;
+constexpr const char* heading = "Save Snapshot"; // also what screen readers call the sheet
 
 } // namespace
 
@@ -30,12 +31,14 @@ VelmoraSaveViewController::VelmoraSaveViewController(const ArrayRef& saveHistory
                                                      std::optional<Time> timeStamp)
     : _timeStamp(timeStamp ? *timeStamp : app.platform().model().clock.now()),
       _saveHistory(saveHistory ? Value(saveHistory).copy().arrayRef() : nullptr), _seal(app.maskSeal()),
-      _app(app) {}
+      _app(app) {
+    setTitle(heading);
+}
 
 VelmoraSaveViewController::~VelmoraSaveViewController() = default;
 
 std::unique_ptr<View> VelmoraSaveViewController::loadView() {
-    auto view = std::make_unique<VelmoraSaveView>(_saveContentTable, _saveDescription);
+    auto view = std::make_unique<VelmoraSaveView>(title(), _saveContentTable, _saveDescription);
     if (_seal)
         _saveDescription.setPlaceholder("Description (left out while identities are masked)");
     view->saveButton().setAction([this] { savePressed(); });
@@ -99,7 +102,7 @@ void VelmoraSaveViewController::savePressed() {
         logFormat(LogPriority::Error, "Unable to write snapshot to %s", path.c_str());
         Alert("File Error", "Unable to write file to disk", "Close").show();
     } else {
-        _app.snapshotWritten();
+        _app.snapshotWritten(path);
     }
     // In both cases: a failure leaves only the notice.
     queueClosing();
@@ -111,6 +114,10 @@ void VelmoraSaveViewController::cancelPressed() {
 
 void VelmoraSaveViewController::queueClosing() {
     _app.platform().model().queue.async([&app = _app] { app.closeSaveView(); });
+}
+
+bool VelmoraSaveViewController::becomeFirstResponder() {
+    return _saveDescription.becomeFirstResponder();
 }
 
 bool VelmoraSaveViewController::textFieldShouldReturn(TextField& textField) {
@@ -130,14 +137,22 @@ std::size_t VelmoraSaveViewController::numberOfRowsInSection(TableView&, std::si
     return _saveHistory ? _saveHistory->size() : 0;
 }
 
+std::string VelmoraSaveViewController::description(std::size_t row) const {
+    const Dictionary* entry = (*_saveHistory)[row].asDictionary();
+    const std::string* text = entry ? (*entry)["Description"].asString() : nullptr;
+    return text ? *text : std::string();
+}
+
+TableRowSummary VelmoraSaveViewController::summaryOfRowAtIndexPath(TableView&, const IndexPath& indexPath) {
+    return {description(indexPath.row()), TableCellAccessory::checkMark};
+}
+
 std::shared_ptr<TableCell> VelmoraSaveViewController::cellForRowAtIndexPath(TableView& tableView,
                                                                             const IndexPath& indexPath) {
     auto cell = tableView.dequeueReusableCell(cellIdentifier);
     if (!cell)
         cell = std::make_shared<TableCell>(TableCellStyle::plain, cellIdentifier);
-    const Dictionary* entry = (*_saveHistory)[indexPath.row()].asDictionary();
-    const std::string* description = entry ? (*entry)["Description"].asString() : nullptr;
-    cell->textLabel().setText(description ? std::string_view(*description) : std::string_view());
+    cell->textLabel().setText(description(indexPath.row()));
     cell->textLabel().setFont(Font::named("Helvetica", cellFontSize));
     cell->setAccessory(TableCellAccessory::checkMark);
     return cell;

@@ -48,12 +48,17 @@ public:
     void cancelPressed();
     void backgroundTouched();
 
+    /// Takes the keyboard for the description.
+    bool becomeFirstResponder() override;
+
     bool textFieldShouldReturn(TextField& textField) override;
 
     [[nodiscard]] std::size_t numberOfSections(TableView& tableView) override;
     [[nodiscard]] std::size_t numberOfRowsInSection(TableView& tableView, std::size_t section) override;
     [[nodiscard]] std::shared_ptr<TableCell> cellForRowAtIndexPath(TableView& tableView,
                                                                    const IndexPath& indexPath) override;
+    [[nodiscard]] TableRowSummary summaryOfRowAtIndexPath(TableView& tableView,
+                                                          const IndexPath& indexPath) override;
     /// Only releases the keyboard focus: every entry is always saved, none can be chosen.
     void didSelectRowAtIndexPath(TableView& tableView, const IndexPath& indexPath) override;
 
@@ -61,6 +66,8 @@ protected:
     [[nodiscard]] std::unique_ptr<View> loadView() override;
 
 private:
+    /// What the list says of that entry.
+    [[nodiscard]] std::string description(std::size_t row) const;
     [[nodiscard]] std::string snapshotPath() const;
     /// With what the field says now, or the seal.
     [[nodiscard]] bool writeSnapshot(const std::string& path) const;

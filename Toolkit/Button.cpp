@@ -22,6 +22,7 @@ Button::Button(std::string_view title, ButtonRole role)
     _button->setText(toQt(title).replace(u'&', QStringLiteral("&&")));
     _button->setAutoDefault(true); // Enter presses it, as Space does
     if (role == ButtonRole::save) {
+        _button->setDefault(true); // looks and is announced as what Enter presses
         QFont font = _button->font();
         font.setBold(true);
         _button->setFont(font);

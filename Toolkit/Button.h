@@ -12,7 +12,8 @@ namespace velmora {
 
 enum class ButtonRole {
     plain,
-    save,  ///< the screen's main action: stands out, Ctrl-S presses it
+    save,  ///< the screen's main action: stands out, Ctrl-S presses it, and Enter where nothing else takes
+           ///< that
     cancel ///< leaves a modal screen: Escape presses it
 };
 

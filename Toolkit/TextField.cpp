@@ -6,13 +6,22 @@
 #include "Toolkit/TextFieldDelegate.h"
 #include "Toolkit/Widgets/Conversions.h"
 
+#include <QKeyEvent>
 #include <QLineEdit>
 
 #include <algorithm>
 
 namespace velmora {
 
-class TextField::Widget : public QLineEdit {};
+class TextField::Widget : public QLineEdit {
+protected:
+    void keyPressEvent(QKeyEvent* event) override {
+        QLineEdit::keyPressEvent(event);
+        // Otherwise the same press would go on to the screen's default button.
+        if (event->key() == Qt::Key_Return || event->key() == Qt::Key_Enter)
+            event->accept();
+    }
+};
 
 TextField::TextField() : View(new Widget), _field(static_cast<Widget*>(widget())) {
     _field->setObjectName("velmora.textField");

@@ -7,7 +7,8 @@
 
 int main(int argc, char** argv) {
     // No display, no bus, no desktop settings: every machine shows the same.
-    ::setenv("QT_QPA_PLATFORM", "offscreen", 1);
+    const char* const platform = std::getenv("VELMORA_TEST_PLATFORM"); // a display of the test's own
+    ::setenv("QT_QPA_PLATFORM", platform ? platform : "offscreen", 1);
     ::setenv("QT_QPA_PLATFORMTHEME", "", 1);
     ::setenv("VELMORA_REDUCED_MOTION", "1", 0); // what is opened is there at once
     ::unsetenv("QT_STYLE_OVERRIDE");

@@ -21,6 +21,7 @@
 
 #include <QAccessible>
 #include <QAccessibleWidget>
+#include <QLabel>
 
 #include <utility>
 
@@ -85,6 +86,25 @@ private:
     SpinnerWidget& _spinner;
 };
 
+/// A text, which is called by itself where it has no other name. Whether it is a heading may be set later.
+class TextAccessible : public QAccessibleWidget {
+public:
+    explicit TextAccessible(QLabel& label)
+        : QAccessibleWidget(&label, QAccessible::StaticText), _label(label) {}
+
+    [[nodiscard]] QAccessible::Role role() const override {
+        const auto* const label = dynamic_cast<const LabelWidget*>(&_label);
+        return label && label->isHeading() ? QAccessible::Heading : QAccessible::StaticText;
+    }
+    [[nodiscard]] QString text(QAccessible::Text which) const override {
+        const bool isNamed = which != QAccessible::Name || !_label.accessibleName().isEmpty();
+        return isNamed ? QAccessibleWidget::text(which) : _label.text();
+    }
+
+private:
+    QLabel& _label;
+};
+
 /// Nothing below it can be used.
 class SheetAccessible : public QAccessibleWidget {
 public:
@@ -104,10 +124,10 @@ QAccessibleInterface* makeInterface(const QString& /*className*/, QObject* objec
         return new TableAccessible(*table);
     if (auto* const cell = dynamic_cast<CellWidget*>(object))
         return new RowAccessible(*cell);
-    if (auto* const label = dynamic_cast<LabelWidget*>(object); label && label->isHeading())
-        return new QAccessibleWidget(label, QAccessible::Heading);
+    if (auto* const label = dynamic_cast<LabelWidget*>(object))
+        return new TextAccessible(*label);
     if (auto* const empty = dynamic_cast<EmptyLabel*>(object))
-        return new QAccessibleWidget(empty, QAccessible::StaticText, empty->text());
+        return new TextAccessible(*empty);
     if (auto* const notice = dynamic_cast<WrappedLabel*>(object))
         return new QAccessibleWidget(notice, QAccessible::AlertMessage);
     if (auto* const sheet = dynamic_cast<SheetWidget*>(object))

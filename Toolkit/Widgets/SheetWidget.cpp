@@ -61,8 +61,11 @@ void SheetWidget::keyPressEvent(QKeyEvent* event) {
     const auto* const window = dynamic_cast<WindowWidget*>(parentWidget());
     if ((window && window->runCommand(*event)) || _isPassive)
         return;
-    const std::function<void()> action = event->matches(QKeySequence::Save)     ? onSave
-                                         : WindowWidget::isBackOrCancel(*event) ? onCancel
+    // A key that is held has already done what it does, such as leaving a field.
+    const bool isEnter =
+        (event->key() == Qt::Key_Return || event->key() == Qt::Key_Enter) && !event->isAutoRepeat();
+    const std::function<void()> action = isEnter || event->matches(QKeySequence::Save) ? onSave
+                                         : WindowWidget::isBackOrCancel(*event)        ? onCancel
                                                                                 : std::function<void()>();
     if (action)
         action();

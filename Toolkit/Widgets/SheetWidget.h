@@ -22,6 +22,7 @@ public:
     /// Called when the window is destroyed with this.
     std::function<void()> onDestroyed;
     std::function<void()> onCancel;
+    /// Ctrl-S, and Enter where no widget of the sheet takes it.
     std::function<void()> onSave;
 
     /// 0 to 1.
