@@ -237,7 +237,7 @@ _velmora_log() {
     fields) options+=(--technology --role --format --safe) ;;
     events) options+=(--format --safe --records --live --clock --technology --kind --severity --from --to --rules
         --no-rules --exec --exec-timeout --fail-on --duration --count --timeout) ;;
-    stats) options+=(--format --safe --histogram --by --select --role --from --to --clock --technology) ;;
+    stats) options+=(--format --safe --histogram --by --select --role --from --to --clock --technology --max-gap) ;;
     diff) options+=(--format --display --select --role --clock --technology) ;;
     mask) options+=(--level --key --technology --keep-unknown --report --force --new-key --check --known) ;;
     columns) options+=(--out --compact --technology) ;;

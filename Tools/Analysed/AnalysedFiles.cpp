@@ -52,9 +52,15 @@ bool analyseFile(std::uint32_t index, const AnalysedInput& input, AnalysisFeed& 
     });
     const DecoderLog log(lines);
     const TrackedResources resources;
-    FileMessages messages(**reader, {index, path, input.technology}, feed, context);
+    std::optional<PositionedReader> positioned;
+    if (input.positions)
+        input.positions(&positioned.emplace(**reader, input.maximumGap));
+    FileMessages messages(positioned ? *positioned : **reader, {index, path, input.technology}, feed,
+                          context);
     messages.setProgress(progress ? progress->get() : nullptr);
     Result<Done> analysed = messages.run(input.isDone);
+    if (input.positions)
+        input.positions(nullptr);
     if (analysed && !resources.failure().empty())
         analysed = Failure{"decoded without its template: " + resources.failure()};
     clearProgress();
