@@ -47,6 +47,8 @@ void TechnologyStatistics::report(const MessageReport& report) {
         _picture.update(report);
         _cell = _cells.numberOf(_picture);
     }
+    if (has(StatisticsPlan::By::Square))
+        _cell = numberOf(_groups.plan().square());
     enter(time);
     if (_part) {
         ++_part->messages;
@@ -61,8 +63,27 @@ void TechnologyStatistics::report(const MessageReport& report) {
 
 void TechnologyStatistics::finish() {
     interrupt();
-    if (_group && isNumbered(_group->key.cell))
-        _group->cell = nameOf(_cells.identity(*_group->key.cell));
+    if (_group)
+        name(*_group);
+}
+
+std::uint32_t TechnologyStatistics::numberOf(const std::optional<Square>& square) {
+    if (!square)
+        return ServingCells::unknown;
+    const auto found = _squares.find(*square);
+    if (found != _squares.end())
+        return found->second;
+    if (_squares.size() == mostSquares)
+        return ServingCells::further;
+    _squaresByNumber.push_back(*square);
+    return _squares[*square] = static_cast<std::uint32_t>(_squaresByNumber.size());
+}
+
+void TechnologyStatistics::name(GroupStatistics& group) const {
+    if (!isNumbered(group.key.cell))
+        return;
+    group.cell = has(StatisticsPlan::By::Square) ? nameOf(_squaresByNumber[*group.key.cell - 1])
+                                                 : nameOf(_cells.identity(*group.key.cell));
 }
 
 void TechnologyStatistics::interrupt() {
@@ -106,8 +127,8 @@ void TechnologyStatistics::enter(Time time) {
     _group = counts ? &_groups.of(keyOf(_place)) : nullptr;
     _part = _group ? &_group->partOf(_catalogue.technology()) : nullptr;
     _leaves.forgetStatistics();
-    if (earlier && isNumbered(earlier->key.cell))
-        earlier->cell = nameOf(_cells.identity(*earlier->key.cell));
+    if (earlier)
+        name(*earlier);
     if (_part && !_groups.plan().leaves.isEverything())
         for (const CatalogueField& leaf : _catalogue.fields())
             if (_leaves.of(leaf).isChosen)
@@ -128,7 +149,7 @@ GroupKey TechnologyStatistics::keyOf(const Place& place) const {
         key.technology = _catalogue.technology();
     if (has(StatisticsPlan::By::File))
         key.input = place.input;
-    if (has(StatisticsPlan::By::Cell))
+    if (has(StatisticsPlan::By::Cell) || has(StatisticsPlan::By::Square))
         key.cell = place.cell;
     if (has(StatisticsPlan::By::Minute))
         key.minute = place.minute;

@@ -11,8 +11,11 @@
 #include "Analysis/Statistics/StatisticsGroups.h"
 
 #include <chrono>
+#include <cstddef>
 #include <cstdint>
+#include <map>
 #include <optional>
+#include <vector>
 
 namespace velmora {
 
@@ -23,6 +26,8 @@ class TechnologyStatistics {
 public:
     static constexpr std::chrono::seconds longestSilence{30};
     static constexpr std::chrono::seconds largestStepBack{1};
+    /// Further squares count as one.
+    static constexpr std::size_t mostSquares = 100'000;
 
     /// Catalogue and groups must outlive it.
     TechnologyStatistics(const Catalogue& catalogue, StatisticsGroups& groups);
@@ -48,6 +53,10 @@ private:
         friend bool operator==(const Place&, const Place&) = default;
     };
 
+    /// The number of the square, as those of cells.
+    [[nodiscard]] std::uint32_t numberOf(const std::optional<Square>& square);
+    /// Names a group of a cell or a square.
+    void name(GroupStatistics& group) const;
     [[nodiscard]] GroupKey keyOf(const Place& place) const;
     /// Time passes, from what has passed already up to there.
     void pass(Time time);
@@ -73,9 +82,11 @@ private:
     std::optional<Time> _now; ///< up to which time has passed; absent after an interruption
     Place _place;
     ServingCells _cells;
-    std::uint32_t _cell = ServingCells::unknown;
-    GroupStatistics* _group = nullptr; ///< the current one; null where nothing counts
-    TechnologyPart* _part = nullptr;   ///< of the group
+    std::map<Square, std::uint32_t> _squares; ///< their numbers, from 1 on
+    std::vector<Square> _squaresByNumber;
+    std::uint32_t _cell = ServingCells::unknown; ///< or the square
+    GroupStatistics* _group = nullptr;           ///< the current one; null where nothing counts
+    TechnologyPart* _part = nullptr;             ///< of the group
     std::uint32_t _input = 0;
 };
 

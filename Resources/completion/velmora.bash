@@ -252,7 +252,7 @@ _velmora_log() {
     fields) options+=(--technology --role --format --safe) ;;
     events) options+=(--format --safe --records --live --clock --technology --mask --key --kind --severity --from --to --rules
         --no-rules --exec --exec-timeout --fail-on --duration --count --timeout) ;;
-    stats) options+=(--format --safe --histogram --by --select --role --from --to --clock --technology) ;;
+    stats) options+=(--format --safe --histogram --by --select --role --from --to --clock --technology --max-gap) ;;
     diff) options+=(--format --display --select --role --clock --technology) ;;
     report) options+=(-o --output --force --with-identities --rules --no-rules --clock --technology --mask --key) ;;
     mask) options+=(--level --key --technology --keep-unknown --report --force --new-key --check --known) ;;

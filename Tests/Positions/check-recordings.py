@@ -11,8 +11,10 @@ BUILD has velmora-log, velmora.lua and tests/make-drive. Capture tools are editc
 from __future__ import annotations
 
 import json
+import math
 import sys
 import tempfile
+from collections import defaultdict
 from pathlib import Path
 
 from positions import distance_from_road, expect, finish, need, run, samples, sentence
@@ -25,7 +27,7 @@ LOG, DRIVE = BUILD / "velmora-log", BUILD / "tests" / "make-drive"
 def fixes_of(recording: Path) -> int:
     (technologies,) = [json.loads(run(LOG, "info", "--format", "json", recording))]
     positions = technologies.get("positions")
-    return positions["fixes"] if positions else 0
+    return int(positions["fixes"]) if positions else 0
 
 
 def check_road(recording: Path, scenario: str) -> None:
@@ -37,6 +39,40 @@ def check_road(recording: Path, scenario: str) -> None:
         expect(distance < 1, f"{scenario}: record {row['record']} is {distance} m from the road")
         expect(0 <= float(row["fix_age"]) <= 1, f"{scenario}: record {row['record']} has age {row['fix_age']}")
         expect(row["hdop"] == "0.90" and row["altitude"] == "12.50", f"{scenario}: record {row['record']}: {row}")
+
+
+def square_of(latitude: float, longitude: float, size: float) -> str:
+    """The square's name, as Documentation/positions.md defines it."""
+    degree = 2 * math.pi * 6_371_008.8 / 360
+    row = math.floor(latitude * degree / size)
+    middle = (row + 0.5) * size / degree
+    columns = max(1, round(360 * degree * math.cos(math.radians(middle)) / size))
+    column = math.floor((longitude + 180) * columns / 360)
+    return f"{middle:.6f},{(column + 0.5) * 360 / columns - 180:.6f}"
+
+
+def check_squares(recording: Path) -> None:
+    """Count and median of each square, of the samples' own positions."""
+    path = "/GSM/GSM Serving Cell/RSSI"
+    values = defaultdict(list)
+    for row in samples(LOG, recording, "--select", path):
+        if row["value"]:
+            name = square_of(float(row["latitude"]), float(row["longitude"]), 50) if row["latitude"] else None
+            values[name].append(float(row["value"]))
+    text = run(LOG, "stats", "--by", "square:50m", "--select", path, "--format", "json", recording)
+    decoder, at, found = json.JSONDecoder(), 0, {}
+    while text[at:].strip():
+        group, length = decoder.raw_decode(text[at:].lstrip())
+        at = len(text) - len(text[at:].lstrip()) + length
+        for technology in group["technologies"]:
+            for field in technology["numbers"]:
+                if field.get("samples"):
+                    found[group["square"]] = (field["samples"], field["p50"])
+    wanted = {name: (len(each), sorted(each)[max(1, -(-len(each) // 2)) - 1]) for name, each in values.items()}
+    expect(len(wanted) > 5, f"{len(wanted)} squares")
+    for name in {*wanted, *found}:
+        expect(found.get(name) == wanted.get(name),
+               f"square {name}: count and median {found.get(name)}, wanted {wanted.get(name)}")
 
 
 def check_samples_without(recording: Path, plain: Path, scenario: str) -> None:
@@ -73,6 +109,8 @@ with tempfile.TemporaryDirectory() as temporary:
     expect(sum(1 for row in both if row["latitude"]) > 0.97 * len(both), "merging loses positions")
     run(LOG, "convert", gsm, copied)
     expect(copied.read_bytes() == gsm.read_bytes(), "a copy of a recording differs")
+
+    check_squares(gsm)
 
     # What masking and other forms leave of them.
     key = directory / "key"

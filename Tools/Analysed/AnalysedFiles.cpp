@@ -60,14 +60,19 @@ bool analyseFile(std::uint32_t index, const AnalysedInput& input, std::optional<
     });
     const DecoderLog log(lines);
     const TrackedResources resources;
+    std::optional<PositionedReader> positioned;
+    if (input.positions)
+        input.positions(&positioned.emplace(**reader, input.maximumGap));
     MaskedInput masked(
-        **reader, path, input.technology,
+        positioned ? *positioned : **reader, path, input.technology,
         masking && !input.technology.empty() ? technologiesOf(path) : std::vector<std::string>(), masking);
     if (input.opensFile)
         input.opensFile(index, masked.reader());
     FileMessages messages(masked.reader(), {index, path, input.technology}, feed, context);
     messages.setProgress(progress ? progress->get() : nullptr);
     Result<Done> analysed = messages.run(input.isDone);
+    if (input.positions)
+        input.positions(nullptr);
     if (analysed && !resources.failure().empty())
         analysed = Failure{"decoded without its template: " + resources.failure()};
     clearProgress();

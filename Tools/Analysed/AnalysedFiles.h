@@ -4,9 +4,11 @@
 #pragma once
 
 #include "Export/Masking/Pseudonyms.h"
+#include "Export/Tracks/PositionedReader.h"
 #include "Tools/Analysed/AnalysisFeed.h"
 #include "Tools/Log/DecoderLines.h"
 
+#include <chrono>
 #include <cstdint>
 #include <functional>
 #include <optional>
@@ -23,9 +25,13 @@ struct AnalysedInput {
     bool showsProgress = true;          ///< of long files, on standard error where that is a terminal
     bool writesAsItGoes = false;        ///< the output is written to while files are read
     std::function<void(std::uint32_t input)> beginsFile = {}; ///< the next file, before its messages
-    std::function<void()> beforeWaiting = {};                 ///< more is waited for, as of a pipe
-    std::function<bool()> whileWaiting = {};                  ///< as FileSource's hook
-    std::function<bool()> isDone = {};                        ///< whether the rest need not be read
+    /// Gets the reader of the positions of the next file's messages, and null after them; null where
+    /// positions are not needed.
+    std::function<void(const PositionedReader* positions)> positions = {};
+    std::chrono::nanoseconds maximumGap = Track::defaultGap; ///< between fixes
+    std::function<void()> beforeWaiting = {};                ///< more is waited for, as of a pipe
+    std::function<bool()> whileWaiting = {};                 ///< as FileSource's hook
+    std::function<bool()> isDone = {};                       ///< whether the rest need not be read
     /// A file has been opened, and nothing of it has been read.
     std::function<void(std::uint32_t input, MessageReader& reader)> opensFile = {};
     /// All of a file has been read that can be; its reader has what was lost, and its comments.

@@ -18,6 +18,7 @@ std::string_view groupColumn(StatisticsPlan::By by) {
     case By::File: return "file";
     case By::Cell: return "cell";
     case By::Minute: return "minute";
+    case By::Square: return "square";
     case By::Nothing:
     case By::Technology: break;
     }
@@ -30,8 +31,11 @@ std::string groupCell(const GroupStatistics& group, const StatsOptions& options)
         return options.files[*key.input];
     if (key.minute)
         return minuteStamp(*key.minute);
+    const bool isSquare = options.by == StatisticsPlan::By::Square;
     if (key.cell == ServingCells::further)
-        return "further cells";
+        return isSquare ? "further squares" : "further cells";
+    if (isSquare && group.cell.empty())
+        return "no position";
     return group.cell.empty() ? "serving cell unknown" : group.cell;
 }
 

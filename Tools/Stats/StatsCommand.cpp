@@ -38,7 +38,14 @@ bool writeStatistics(const StatsOptions& options, bool checksPaths, DecoderLines
     const std::unique_ptr<StatsWriter> writer = makeWriter(options, output);
     writer->begin();
     bool hasGroups = false;
-    StatisticsGroups groups({options.by, leafChoice(options.selection, options.roles)},
+    const PositionedReader* positions = nullptr;
+    const auto square = [&]() -> std::optional<Square> {
+        if (!positions || !positions->position())
+            return std::nullopt;
+        const Fix& fix = positions->position()->fix;
+        return Square::of({fix.latitude, fix.longitude}, options.squareSize_m);
+    };
+    StatisticsGroups groups({options.by, leafChoice(options.selection, options.roles), square},
                             [&](const GroupStatistics& group) {
                                 hasGroups = true;
                                 writer->write(group);
@@ -54,6 +61,9 @@ bool writeStatistics(const StatsOptions& options, bool checksPaths, DecoderLines
     input.files = options.files;
     input.technology = options.technology;
     input.writesAsItGoes = options.by == StatisticsPlan::By::Minute;
+    if (options.by == StatisticsPlan::By::Square)
+        input.positions = [&positions](const PositionedReader* reader) { positions = reader; };
+    input.maximumGap = options.maximumGap;
     input.isDone = [&output] { return !output.isOpen(); };
     const bool good = analyseFiles(input, *feed, lines);
     feed->finish();

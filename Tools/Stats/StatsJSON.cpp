@@ -28,6 +28,12 @@ void setGroup(Dictionary& object, const GroupStatistics& group, const StatsOptio
         if (key.cell == ServingCells::further)
             object.set("furtherCells", true);
         return;
+    case By::Square:
+        object.set("technology", key.technology);
+        object.set("square", group.cell.empty() ? Value() : Value(group.cell));
+        if (key.cell == ServingCells::further)
+            object.set("furtherSquares", true);
+        return;
     case By::Minute:
         object.set("technology", key.technology);
         object.set("minute", key.minute ? timeValue(*key.minute) : Value());

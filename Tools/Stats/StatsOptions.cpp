@@ -4,12 +4,31 @@
 #include "Tools/Stats/StatsOptions.h"
 
 #include "Tools/CommandOptions.h"
+#include "Tools/Messages/PositionOptions.h"
 #include "Tools/Messages/SelectionOptions.h"
 #include "Tools/Stats/ChoiceOptions.h"
+
+#include <charconv>
+#include <optional>
+#include <string_view>
+#include <system_error>
 
 namespace velmora {
 
 namespace {
+
+/// "square:50m": the metres, from 1 to 100000.
+std::optional<double> squareSize(std::string_view text) {
+    constexpr std::string_view begin = "square:";
+    constexpr double largest = 100'000;
+    if (!text.starts_with(begin) || !text.ends_with('m'))
+        return std::nullopt;
+    text = text.substr(begin.size(), text.size() - begin.size() - 1);
+    double size = 0;
+    const auto read = std::from_chars(text.data(), text.data() + text.size(), size, std::chars_format::fixed);
+    const bool isWhole = read.ec == std::errc() && read.ptr == text.data() + text.size();
+    return isWhole && size >= 1 && size <= largest ? std::optional(size) : std::nullopt;
+}
 
 void checkTogether(const StatsOptions& options) {
     using Format = StatsOptions::Format;
@@ -51,15 +70,24 @@ CLI::App* addStats(CLI::App& app, StatsOptions& options) {
             "--by",
             [&options](const std::string& name) {
                 using By = StatisticsPlan::By;
-                options.by = name == "file"         ? By::File
-                             : name == "technology" ? By::Technology
-                             : name == "cell"       ? By::Cell
-                                                    : By::Minute;
+                options.squareSize_m = squareSize(name).value_or(0);
+                options.by = options.squareSize_m > 0 ? By::Square
+                             : name == "file"         ? By::File
+                             : name == "technology"   ? By::Technology
+                             : name == "cell"         ? By::Cell
+                                                      : By::Minute;
             },
             "Statistics for each file, technology, serving cell or minute of the clock, instead of all "
-            "together")
-        ->check(oneOf({"file", "technology", "cell", "minute"}))
-        ->type_name("file|technology|cell|minute");
+            "together; "
+            "square:50m: for each square of the map with sides of 50 m")
+        ->check(validator(
+            [](const std::string& name) {
+                return name == "file" || name == "technology" || name == "cell" || name == "minute" ||
+                       squareSize(name);
+            },
+            "file or technology or cell or minute or square:50m"))
+        ->type_name("file|technology|cell|minute|SQUARE");
+    addMaximumGap(*command, options.maximumGap);
     addChoice(*command, options.selection, options.roles);
     addRange(*command, options.range, "Only what is reported at or after this time; what was before is known",
              "Only what is reported before this time");
@@ -79,6 +107,7 @@ CLI::App* addStats(CLI::App& app, StatsOptions& options) {
         "  velmora-log stats drive.pcapng\n"
         "  velmora-log stats --role serving --histogram drive.pcapng\n"
         "  velmora-log stats --by cell --select '/GSM/GSM Serving Cell/RSSI' drive.pcapng\n"
+        "  velmora-log stats --by square:50m --role serving.level --format csv drive.pcapng\n"
         "  velmora-log stats --by minute --format csv --role serving.level monday/*.pcapng > level.csv\n"
         "  velmora-log stats --format json drive.pcapng | jq '.roles[] | {role, p50, worstMinute}'");
     command->callback([&options] { checkTogether(options); });

@@ -4,12 +4,14 @@
 #pragma once
 
 #include "Analysis/Statistics/StatisticsPlan.h"
+#include "Analysis/Tracks/Track.h"
 #include "Tools/Analysed/AnalysisClock.h"
 #include "Tools/Decode/Paths/NodeSelection.h"
 #include "Tools/Fields/RoleSelection.h"
 #include "Tools/Messages/TimeRange.h"
 #include "Tools/Text/CSVText.h"
 
+#include <chrono>
 #include <string>
 #include <vector>
 
@@ -25,6 +27,8 @@ struct StatsOptions {
 
     Format format = Format::Text;
     StatisticsPlan::By by = StatisticsPlan::By::Nothing;
+    double squareSize_m = 0;                                 ///< by squares
+    std::chrono::nanoseconds maximumGap = Track::defaultGap; ///< between fixes; by squares
     NodeSelection selection;
     RoleSelection roles;
     TimeRange range;

@@ -175,7 +175,8 @@ TEST_F(StatsCommandTest, OptionsThatMakeNoSenseTogetherAreRefused) {
              {{"stats", "--safe", "a"}, "--safe: got another format, wanted --format csv"},
              {{"stats", "--histogram", "--format", "csv", "a"},
               "--histogram: got --format csv too, wanted --format text or json"},
-             {{"stats", "--by", "hour", "a"}, "--by: got hour, wanted file or technology or cell or minute"},
+             {{"stats", "--by", "hour", "a"},
+              "--by: got hour, wanted file or technology or cell or minute or square:50m"},
              {{"stats", "--clock", "wall", "a"}, "--clock: got wall, wanted arrival or modem"},
              {{"stats", "--role", "level", "a"}, "--role: got level, wanted one of serving.mcc, "}}) {
         const CommandLine line = parse(arguments);
