@@ -1,11 +1,9 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
+#include "Benchmarks/DriveReader.h"
 #include "Platform/Console.h"
 #include "Platform/Linux/Files/FileResources.h"
-#include "Platform/TelephonyService.h"
-#include "Recording/MessageReader.h"
-#include "Telephony/Drives/ScenarioRegistry.h"
 #include "Tools/Decode/DecodeWriter.h"
 #include "Tools/Decode/Samples/SampleColumns.h"
 #include "Tools/Output.h"
@@ -65,34 +63,6 @@ void textOfATime(benchmark::State& state) {
     state.SetBytesProcessed(state.iterations() * static_cast<std::int64_t>(out.size()));
 }
 BENCHMARK(textOfATime);
-
-/// A drive that is in memory already.
-class DriveReader final : public MessageReader {
-public:
-    DriveReader(const ScenarioKind& kind, std::size_t count) {
-        const std::unique_ptr<Scenario> scenario = kind.make(1);
-        _technology = shortTechnologyName(scenario->technology());
-        for (std::size_t i = 0; i < count; ++i) {
-            const ScenarioEvent event = scenario->next();
-            _messages.push_back({Time(event.offset), event.message, i + 1, 0});
-        }
-    }
-
-    void rewind() { _next = 0; }
-    [[nodiscard]] std::optional<LoggedMessage> next() override {
-        if (_next == _messages.size())
-            return std::nullopt;
-        return _messages[_next++];
-    }
-    [[nodiscard]] const std::string& technology() const override { return _technology; }
-    [[nodiscard]] const std::optional<Failure>& failure() const override { return _failure; }
-
-private:
-    std::string _technology;
-    std::vector<LoggedMessage> _messages;
-    std::size_t _next = 0;
-    std::optional<Failure> _failure;
-};
 
 enum Printed : std::int64_t { TheEnd, EveryRefresh, EveryMessage, SampleObjects, SampleCells };
 

@@ -110,7 +110,7 @@ void Base::keepPrepared(const View& view, const Record& record, KeptRecords::Par
 }
 
 void Base::observeRecord(const View& view, const Record& record) {
-    if (_observer->beginSection(*_fieldMap, view.code))
+    if (_observer->beginSection(*_fieldMap, view.code) && !_fieldMap->isEmpty())
         decode(view, record, *_observer);
 }
 

@@ -17,6 +17,11 @@ bool isBefore(const FieldMap::Entry& a, const List* list, const Field* field) {
     return a.list != list ? std::less<>()(a.list, list) : std::less<>()(a.field, field);
 }
 
+/// Whether the telephony service may supply a dictionary or an array, whose leaves messages name.
+bool mayBeTree(const Field& field) {
+    return field.place.isComputed() && field.format.kind == TextFormat::Kind::Text;
+}
+
 } // namespace
 
 void FieldMap::sort() {
@@ -25,31 +30,33 @@ void FieldMap::sort() {
                      [](const Entry& a, const Entry& b) { return isBefore(a, b.list, b.field); });
     _wanted = _entries;
     _tables.clear();
-    setCodes();
+    _codes.reset();
 }
 
 void FieldMap::setWanted(const WantedLeaves& wanted) {
     const auto isWanted = [&wanted](const auto& each) { return wanted.hasAnyAt(*each.node); };
     _wanted.clear();
-    std::copy_if(_entries.begin(), _entries.end(), std::back_inserter(_wanted), isWanted);
+    std::copy_if(_entries.begin(), _entries.end(), std::back_inserter(_wanted),
+                 [&](const Entry& each) { return isWanted(each) || mayBeTree(*each.field); });
     _wantedLists.clear();
     std::copy_if(_lists.begin(), _lists.end(), std::back_inserter(_wantedLists), isWanted);
     _tables.clear();
     _expected = 0;
-    setCodes();
+    _codes = wantedCodes();
 }
 
-void FieldMap::setCodes() {
-    _codes.clear();
+std::vector<std::uint32_t> FieldMap::wantedCodes() const {
+    std::vector<std::uint32_t> codes;
     for (const Entry& each : _wanted)
-        _codes.push_back(each.source->code);
+        codes.push_back(each.source->code);
     // A record that has no wanted field of a list replaces it all the same.
     for (const Entry& each : _entries)
         if (std::any_of(_wantedLists.begin(), _wantedLists.end(),
                         [&each](const ListEntry& list) { return list.list == each.list; }))
-            _codes.push_back(each.source->code);
-    std::sort(_codes.begin(), _codes.end());
-    _codes.erase(std::unique(_codes.begin(), _codes.end()), _codes.end());
+            codes.push_back(each.source->code);
+    std::sort(codes.begin(), codes.end());
+    codes.erase(std::unique(codes.begin(), codes.end()), codes.end());
+    return codes;
 }
 
 std::span<const FieldMap::Entry> FieldMap::find(const List* list, const Field& field) const {

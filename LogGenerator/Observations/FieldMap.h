@@ -64,7 +64,7 @@ public:
     [[nodiscard]] bool isEmpty() const { return _wanted.empty() && _wantedLists.empty(); }
     /// Whether records of that code may report a wanted leaf or a list of them.
     [[nodiscard]] bool hasCode(std::uint32_t code) const {
-        return std::binary_search(_codes.begin(), _codes.end(), code);
+        return !_codes || std::binary_search(_codes->begin(), _codes->end(), code);
     }
     /// The leaves that show the field; most have one. Fields are looked up fastest in the order of their
     /// tables.
@@ -91,7 +91,7 @@ private:
         std::uint32_t code;
         std::vector<Entry> entries;
     };
-    void setCodes();
+    [[nodiscard]] std::vector<std::uint32_t> wantedCodes() const;
     std::span<const Entry> addTable(const List* list, const Layout& layout, std::uint32_t code) const;
 
     Catalogue* _catalogue = nullptr;
@@ -100,7 +100,7 @@ private:
     std::vector<ListEntry> _lists;
     std::vector<Entry> _wanted; ///< of the entries, in their order
     std::vector<ListEntry> _wantedLists;
-    std::vector<std::uint32_t> _codes; ///< of what is wanted, in order
+    std::optional<std::vector<std::uint32_t>> _codes; ///< of what is wanted, in order; absent: any
     mutable std::vector<Table> _tables;
     mutable std::optional<Time> _latestRecord; ///< no part of what the map says of the section
     mutable std::size_t _expected = 0;         ///< the entry that follows the one found last

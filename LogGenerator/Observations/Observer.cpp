@@ -33,7 +33,7 @@ bool Observer::beginSection(const FieldMap& map, std::uint32_t code) {
     _sections.push_back(section);
     _map = &map;
     _code = code;
-    return !map.isEmpty();
+    return true;
 }
 
 ObservedMessage Observer::message(Time arrival, std::optional<std::uint32_t> code,

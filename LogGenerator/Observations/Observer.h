@@ -33,8 +33,7 @@ public:
     /// A message begins; what was observed of the earlier one is gone.
     void beginMessage();
     /// The fields of a section follow, from a record of that code. False where the section has named that
-    /// record's fields already: a code that is subscribed twice is observed once. Also where nothing of the
-    /// section is wanted.
+    /// record's fields already: a code that is subscribed twice is observed once.
     [[nodiscard]] bool beginSection(const FieldMap& map, std::uint32_t code);
     /// The decoder found the message malformed. The first damage of a message counts.
     void damaged(Damage damage) {
