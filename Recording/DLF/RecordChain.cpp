@@ -56,7 +56,7 @@ RecordChain::Survey RecordChain::survey() {
         std::optional<RecordCandidate> candidate = candidateAt(0, framing, _timestamp);
         if (!candidate)
             continue;
-        const bool isWhole = scoreFollower(0, *candidate, _timestamp);
+        const bool isWhole = scoreFollower(0, *candidate);
         if (isWhole && candidate->followerScore >= _weights.goodFollower &&
             candidate->total() >= _weights.expected)
             keepBetter(found.linked, *candidate);
@@ -84,15 +84,13 @@ int RecordChain::scoreAt(std::size_t at, std::optional<std::uint64_t> nearby) {
     return most;
 }
 
-/// Scores what follows the candidate at `at`; `nearby` is for one without a time of its own. False if that is
-/// past the end of the input.
-bool RecordChain::scoreFollower(std::size_t at, RecordCandidate& candidate,
-                                std::optional<std::uint64_t> nearby) {
+/// Scores what follows the candidate at `at`. False if that is past the end of the input.
+bool RecordChain::scoreFollower(std::size_t at, RecordCandidate& candidate) {
     const std::size_t end = at + candidate.size;
     if (!_input.ensure(end))
         return false;
     candidate.followerScore = _input.ensure(end + 1)
-                                  ? scoreAt(end, candidate.hasTime() ? candidate.timestamp : nearby)
+                                  ? scoreAt(end, candidate.hasTime() ? candidate.timestamp : _timestamp)
                                   : _weights.endOfInput;
     return true;
 }
@@ -107,7 +105,7 @@ bool RecordChain::isConvincingAt(std::size_t at, int least, std::optional<std::u
         // Any two bytes may be a length: what they lead to is read only with some score.
         if (!candidate || (framing == Framing::Nothing && candidate->score < 0))
             continue;
-        if (scoreFollower(at, *candidate, nearby) && candidate->followerScore >= _weights.goodFollower &&
+        if (scoreFollower(at, *candidate) && candidate->followerScore >= _weights.goodFollower &&
             candidate->total() >= least)
             return true;
     }

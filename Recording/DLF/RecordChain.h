@@ -67,8 +67,7 @@ private:
     [[nodiscard]] std::optional<RecordCandidate> candidateAt(std::size_t at, Framing framing,
                                                              std::optional<std::uint64_t> nearby);
     [[nodiscard]] int scoreAt(std::size_t at, std::optional<std::uint64_t> nearby);
-    [[nodiscard]] bool scoreFollower(std::size_t at, RecordCandidate& candidate,
-                                     std::optional<std::uint64_t> nearby);
+    [[nodiscard]] bool scoreFollower(std::size_t at, RecordCandidate& candidate);
     [[nodiscard]] bool isConvincingAt(std::size_t at, int least, std::optional<std::uint64_t> nearby);
     [[nodiscard]] bool containsBetterRecord(const RecordCandidate& candidate);
     [[nodiscard]] Survey survey();
