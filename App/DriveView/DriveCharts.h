@@ -9,7 +9,6 @@
 #include "Toolkit/Charts/ChartView.h"
 
 #include <array>
-#include <map>
 #include <memory>
 #include <string>
 #include <vector>

@@ -52,7 +52,7 @@ void DriveView::update(Time now, std::string_view link) {
     for (const Event& each : _model.events()) {
         if (each.kind == rowOf(EventKind::Malformed).name)
             continue; // says nothing about the network
-        change = clockText(each.time, _clock) + ' ' + (each.text.empty() ? each.kind : each.text);
+        change = clockText(each.time, _clock) + ' ' + eventText(each);
         break;
     }
     _now.show(known, _model.classes(), now, link, change);

@@ -44,6 +44,7 @@ void DriveViewController::refreshNow() {
     _second = std::chrono::floor<std::chrono::seconds>(now);
     _shownLink = _link();
     driveView().update(now, _shownLink);
+    _charted = now;
     driveView().updateCharts(now);
 }
 
@@ -59,8 +60,11 @@ void DriveViewController::refresh() {
         return; // not even an age has changed
     _shownLink = std::move(link);
     driveView().update(now, _shownLink);
-    if (isNewSecond)
-        driveView().updateCharts(now);
+    // A clock may also be set back.
+    if (now - _charted < chartInterval && now >= _charted)
+        return;
+    _charted = now;
+    driveView().updateCharts(now);
 }
 
 } // namespace velmora

@@ -17,8 +17,9 @@ namespace velmora {
 /// nothing is drawn or computed.
 class DriveViewController final : public ViewController {
 public:
-    /// How often numbers and lists are refreshed; the charts are once a second.
+    /// How often numbers and lists are refreshed, and the charts, which hardly move in less.
     static constexpr std::chrono::milliseconds refreshInterval{250};
+    static constexpr std::chrono::seconds chartInterval{2};
 
     /// `link` says why no messages arrive; empty where they do. All must outlive the controller.
     DriveViewController(const DriveModel& model, const DriveHistory& history, const Clock& clock,
@@ -48,6 +49,7 @@ private:
     /// What the view shows.
     std::uint64_t _messages = 0;
     Time _second{};
+    Time _charted{};
     std::string _shownLink;
 };
 

@@ -26,16 +26,20 @@ std::vector<GridColumn> eventColumns() {
     return {{"Time", "23:59:59"}, {"Severity", "warning"}, {"Event", ""}};
 }
 
+std::string eventText(const Event& event) {
+    return event.kind + (event.text.empty() ? "" : ": " + event.text) +
+           (event.lasts && !event.end ? " (lasts)" : "");
+}
+
 EventRows eventRows(const std::deque<Event>& events, const SeverityFilter& filter, const Clock& clock) {
     EventRows made;
     for (const Event& each : events) {
         if (!filter[static_cast<std::size_t>(each.severity)])
             continue;
-        const std::string text = each.text.empty() ? each.kind : each.text;
-        const std::string lasting = each.lasts && !each.end ? " (lasts)" : "";
+        const std::string text = eventText(each);
         made.rows.push_back({{clockText(each.time, clock), {}, Color::automatic, {}},
                              {std::string(nameOf(each.severity)), {}, colorOf(each.severity), {}},
-                             {text + lasting, {}, Color::automatic, each.kind + ", " + text + lasting}});
+                             {text, {}, Color::automatic, {}}});
         made.times.push_back(each.time);
     }
     return made;

@@ -10,6 +10,7 @@
 #include <array>
 #include <cstddef>
 #include <deque>
+#include <string>
 #include <vector>
 
 namespace velmora {
@@ -18,6 +19,8 @@ namespace velmora {
 using SeverityFilter = std::array<bool, 3>;
 
 [[nodiscard]] std::vector<GridColumn> eventColumns();
+/// "handover: PCI 62 on EARFCN 6300 to PCI 17 on EARFCN 6300".
+[[nodiscard]] std::string eventText(const Event& event);
 /// The events that the filter lets through, in their order, and which ones these are.
 struct EventRows {
     std::vector<GridRow> rows;

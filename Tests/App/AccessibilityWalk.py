@@ -3,7 +3,9 @@
 """Uses the application as a screen reader does: from another process, through the accessibility tree.
 
 The real service and the real application run as processes. The walk opens every row of the first pane and what opens in
-the panes below, and looks at roles, names, states and positions there; it saves a snapshot, sees the service die and come back, then with another technology, starts the application anew, and ends it. Once more it looks at the screen in a language that is written from right to left.
+the panes below, and looks at roles, names, states and positions there; it goes to the drive view and back, saves a
+snapshot, sees the service die and come back, then with another technology, starts the application anew, and ends it.
+Once more it looks at the screen in a language that is written from right to left.
 """
 
 import os
@@ -118,6 +120,8 @@ class Walk:
         self.press("push button", "Back")
         self.see("heading", "Velmora")
 
+        self.walk_drive()
+
         # A snapshot.
         self.press("push button", "Save")
         self.see("list item", "DLF binary (")
@@ -228,6 +232,49 @@ class Walk:
         self.application.terminate()
         assert self.application.wait(LIMIT_S) == 0, "the application did not end well"
         self.application = None
+
+    def walk_drive(self):
+        """The drive view: what is heard of the serving cell, the tables, the charts, and the way back."""
+        self.press("push button", "Drive")
+        self.see("heading", "Drive")
+        level = self.see("label", "Level, dBm, \u2212").get_name()
+        assert " s ago" in level, f"the level's age is not heard: {level!r}"
+        assert any(word in level for word in ("poor", "fair", "good", "excellent")), level
+        self.see("label", "PLMN, 001-01")
+        self.see("label", "Latest event, ")
+        neighbours = self.see("table", "Neighbours")
+        self.wait("rows of neighbours", lambda: neighbours.get_table_iface().get_n_rows() > 0)
+        table = neighbours.get_table_iface()
+        heads = [table.get_column_description(i) for i in range(table.get_n_columns())]
+        assert heads[2:] == ["Level, dBm", "Quality, dB", "\u0394 dB"], heads
+        spoken = table.get_accessible_at(0, 2).get_name()
+        assert spoken.startswith("\u2212") and " dBm" in spoken, f"a level is heard as {spoken!r}"
+        events = self.wait("the events", lambda: self.find_any("table", "Events"))
+        self.wait("events", lambda: events.get_table_iface().get_n_rows() > 0)
+        # A severity that is not listed is a button that is not checked.
+        info = self.wait("the filter", lambda: self.find_any("", "Info"))
+        assert info.get_state_set().contains(Atspi.StateType.CHECKED), "the filter is on, unheard"
+        info.do_action(0)
+        self.wait("the filter off", lambda: not info.get_state_set().contains(Atspi.StateType.CHECKED))
+        info.do_action(0)
+        self.wait("the charts", lambda: self.find_any("", "Over time"))
+        self.press("push button", "Back to Velmora")
+        self.see("heading", "Velmora")
+        self.wait("the drive view closed", lambda: self.find("table", "Neighbours") is None)
+
+    def find_any(self, role, start):
+        """As find, but of all objects, shown or further down the page; any role for an empty one."""
+        waiting = [Atspi.get_desktop(0)]
+        found = None
+        while waiting:
+            item = waiting.pop(0)
+            if item is None:
+                continue
+            if (not role or item.get_role_name() == role) and item.get_name().startswith(start):
+                found = item
+            if item.get_role_name() != "table":  # cells
+                waiting[:0] = [item.get_child_at_index(i) for i in range(item.get_child_count())]
+        return found
 
     def start_anew(self):
         """Another technology: the notice, the save screen that comes first, and the same process again."""
