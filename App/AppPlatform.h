@@ -3,9 +3,12 @@
 
 #pragma once
 
+#include "Analysis/Rules/RuleSet.h"
 #include "Model/VelmoraModel.h"
 #include "Platform/FileSystem.h"
 #include "Platform/Preferences.h"
+
+#include <vector>
 
 namespace velmora {
 
@@ -17,6 +20,9 @@ public:
     [[nodiscard]] virtual ModelPlatform model() = 0;
     [[nodiscard]] virtual FileSystem& files() = 0;
     [[nodiscard]] virtual Preferences& preferences() = 0;
+    /// The files of the rules for events and level classes, those that come along and the user's. None by
+    /// default.
+    [[nodiscard]] virtual std::vector<RuleFile> ruleFiles() { return {}; }
 };
 
 } // namespace velmora

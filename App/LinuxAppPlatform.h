@@ -5,6 +5,9 @@
 
 #include "App/AppPlatform.h"
 #include "Platform/Clock.h"
+#include "Platform/Linux/Files/FileResources.h"
+#include "Platform/Linux/Files/Files.h"
+#include "Platform/Linux/Files/FolderFiles.h"
 #include "Platform/Linux/Files/LinuxFileSystem.h"
 #include "Platform/Linux/Files/LinuxPreferences.h"
 #include "Platform/Linux/MachineClock.h"
@@ -13,9 +16,12 @@
 #include "Platform/Linux/QtMainQueue.h"
 #include "Platform/SystemLog.h"
 
+#include <algorithm>
+#include <filesystem>
 #include <optional>
 #include <string>
 #include <utility>
+#include <vector>
 
 namespace velmora {
 
@@ -34,6 +40,23 @@ public:
     }
     [[nodiscard]] FileSystem& files() override { return _files; }
     [[nodiscard]] Preferences& preferences() override { return _preferences; }
+    [[nodiscard]] std::vector<RuleFile> ruleFiles() override {
+        const std::vector<std::filesystem::path> own = FileResources::ownDirectories();
+        std::vector<RuleFile> files;
+        for (const FolderFile& each : filesInFolder(FileResources::standardDirectories(), "rules", "toml")) {
+            const Result<Data> content = readFile(each.path, RuleSet::mostBytes);
+            if (!content) {
+                logFormat(LogPriority::Error, "%s: %s", each.path.c_str(), content.reason().c_str());
+                continue;
+            }
+            const bool isUsers =
+                std::find(own.begin(), own.end(), each.path.parent_path().parent_path()) != own.end();
+            const Bytes bytes = content->bytes();
+            files.push_back(
+                {each.path.string(), std::string(bytes.begin(), bytes.end()), each.layer, !isUsers});
+        }
+        return files;
+    }
 
 private:
     QtMainQueue _queue;

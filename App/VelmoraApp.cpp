@@ -3,6 +3,7 @@
 
 #include "App/VelmoraApp.h"
 
+#include "App/DriveView/DriveScreen.h"
 #include "App/MaskingModel.h"
 #include "App/Playback/PlaybackController.h"
 #include "App/Recording/RecordingSwitch.h"
@@ -12,6 +13,7 @@
 #include "Platform/SystemLog.h"
 #include "Toolkit/Alert.h"
 #include "Toolkit/Navigation/NavigationController.h"
+#include "Toolkit/Navigation/SplitController.h"
 #include "Toolkit/Screen.h"
 #include "Toolkit/Window.h"
 
@@ -32,6 +34,8 @@ constexpr char privacyKey = 'M';
 constexpr char closeKey = 'W';
 constexpr char recordKey = 'R';
 constexpr char noteKey = 'B';
+constexpr char driveKey = 'D';
+constexpr char pinKey = 'P';
 constexpr const char* maskedNotice = "Identities are masked. Ctrl-M shows them.";
 
 } // namespace
@@ -43,10 +47,12 @@ VelmoraApp::VelmoraApp(int& argc, char** argv, const PlatformMaker& makePlatform
 
 VelmoraApp::~VelmoraApp() {
     // A retry that is due holds the model beyond this; the ports do not stay open for it.
-    if (_model)
-        _model->destroyPorts();
     if (_navController)
         _navController->setAccessories({});
+    if (!_model)
+        return;
+    _model->destroyPorts();
+    _model->setDrive(nullptr);
 }
 
 void VelmoraApp::applicationDidFinishLaunching(Application&) {
@@ -54,6 +60,8 @@ void VelmoraApp::applicationDidFinishLaunching(Application&) {
     _window = std::make_shared<Window>(Screen::mainBounds());
     _privacy = std::make_unique<PrivacySwitch>(_platform->preferences(), _maskKey);
     makeRecordingSwitch();
+    _drive = std::make_unique<DriveScreen>(*_platform, [this] { return _model && _model->isConnected(); });
+    _model->setDrive(&_drive->model());
     setUpdateMessage(connecting);
     _dateFormatter =
         std::make_unique<DateFormatter>(_platform->model().clock, "'Updated' yyyy-MM-dd 'at' HH:mm:ss");
@@ -61,13 +69,17 @@ void VelmoraApp::applicationDidFinishLaunching(Application&) {
     rootPane->setStatus("Connecting", true);
     _navController = std::make_shared<NavigationController>(rootPane);
     _navController->setDelegate(this);
-    _window->setRootViewController(_navController);
+    _window->setRootViewController(_drive->standBeside(_navController));
+    if (_beginsWithDrive)
+        _drive->open();
     _window->setCommand(privacyKey, [this] { togglePrivacy(); });
     _window->setCommand(closeKey, [this] { closeRecording(); });
     _window->setCommand(recordKey,
                         [this] { _recording->toggle(_model->technology(), _model->isConnected()); });
     _window->setCommand(noteKey, [this] { _recording->askNote(); });
     _window->setOnDrop([this](const std::string& path) { openRecording(path); });
+    _window->setCommand(driveKey, [this] { _drive->toggle(); });
+    _window->setCommand(pinKey, [this] { pinFocusRow(); });
     updateNotice();
     _window->makeKeyAndVisible();
     // The screen is up before the first exchange with the telephony service, which blocks. The display's
@@ -104,7 +116,12 @@ void VelmoraApp::applicationWillTerminate() {
     _navController->setAccessories({});
     _playback.reset();
     setWindow(nullptr);
+    _model->setDrive(nullptr);
     _model.reset();
+}
+
+const VelmoraModel& VelmoraApp::model() const {
+    return *_model;
 }
 
 void VelmoraApp::getSaveButtonPref() {
@@ -164,6 +181,7 @@ void VelmoraApp::togglePrivacy() {
     closeSaveView();
     if (_recordingPath.empty())
         _model->forget();
+    _drive->forget();
     clearPanes();
     if (_playback)
         if (const auto done = _playback->reopen(); !done)
@@ -173,6 +191,11 @@ void VelmoraApp::togglePrivacy() {
         return;
     _window->displayIfNeeded(); // the connection may block for seconds
     _platform->model().queue.async([model = _model] { model->restartMonitor(); });
+}
+
+void VelmoraApp::pinFocusRow() {
+    if (_model)
+        static_cast<VelmoraPaneController&>(*_navController->topViewController()).togglePinOfFocusRow();
 }
 
 void VelmoraApp::clearPanes() {
@@ -230,8 +253,10 @@ void VelmoraApp::connectionChanged() {
         logLine(LogPriority::Error, line);
     if (!line.empty() || _model->isConnected())
         _loggedProblem = line;
-    if (!_model->isConnected())
-        _window->displayIfNeeded(); // the next attempt to connect may block for seconds
+    if (_model->isConnected())
+        return;
+    _drive->linkLost();
+    _window->displayIfNeeded(); // the next attempt to connect may block for seconds
 }
 
 void VelmoraApp::updateNotice() {

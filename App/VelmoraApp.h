@@ -22,6 +22,8 @@
 
 namespace velmora {
 
+class DriveScreen;
+class MaskingModel;
 class NavigationController;
 class PlaybackController;
 class RecordingSwitch;
@@ -84,6 +86,12 @@ public:
     /// The panes begin empty, with a new connection, so that nothing decoded before is shown.
     void togglePrivacy();
 
+    /// Shows the drive view at first, on a narrow window too. Set before the application runs.
+    void setBeginsWithDrive(bool begins) { _beginsWithDrive = begins; }
+    /// Pins the row of the top pane that has the keyboard as a chart of the drive view, or takes it off;
+    /// nothing for a row without a number.
+    void pinFocusRow();
+
     /// The notice's button after a change of technology: ends the application, for its caller to start it
     /// anew. Where there is something to save and panes offer that, the save screen comes first: once a
     /// snapshot is written the application ends; without one it takes another press.
@@ -121,8 +129,9 @@ public:
 
     /// Precondition for both: the application has launched.
     [[nodiscard]] NavigationController& navController() const { return *_navController; }
-    [[nodiscard]] const VelmoraModel& model() const { return *_model; }
+    [[nodiscard]] const VelmoraModel& model() const;
     [[nodiscard]] AppPlatform& platform() const { return *_platform; }
+    [[nodiscard]] DriveScreen& drive() const { return *_drive; }
 
 private:
     struct Properties {
@@ -153,7 +162,8 @@ private:
     std::shared_ptr<VelmoraSaveViewController> _saveViewController;
     std::optional<MaskKey> _maskKey;
     std::unique_ptr<PrivacySwitch> _privacy; ///< the model refers to it
-    std::shared_ptr<VelmoraModel> _model;
+    std::unique_ptr<DriveScreen> _drive;     ///< so does it to this
+    std::shared_ptr<MaskingModel> _model;
     [[maybe_unused]] bool _allowSaveButton = false; ///< unused: the property has the flag
     std::string _recordingPath;
     std::string _recordingTechnology;
@@ -166,6 +176,7 @@ private:
     std::function<Result<Done>()> _willConnect;
     ConnectionNotice _notice;
     std::string _loggedProblem;
+    bool _beginsWithDrive = false;
     bool _startsAnew = false;
     bool _offeredSave = false;    ///< the notice's button has opened the save screen
     bool _endsOnceSaved = false;  ///< that save screen is open

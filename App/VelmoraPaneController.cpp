@@ -3,6 +3,7 @@
 
 #include "App/VelmoraPaneController.h"
 
+#include "App/DriveView/DriveScreen.h"
 #include "App/VelmoraApp.h"
 #include "App/VelmoraCell.h"
 #include "Model/NodePath.h"
@@ -117,11 +118,31 @@ void VelmoraPaneController::didSelectRowAtIndexPath(TableView& tableView, const 
         tableView.deselectRow(indexPath, false);
         return;
     }
-    const auto pane = std::make_shared<VelmoraPaneController>(
-        node, appendingPathComponent(_keyPath, node->displayName()), _app);
+    const auto pane = std::make_shared<VelmoraPaneController>(node, pathOfRow(indexPath), _app);
     pane->setStatus(_status, _isLoading);
     if (NavigationController* stack = navigationController())
         stack->pushViewController(pane, true);
+}
+
+std::vector<MenuItem> VelmoraPaneController::menuForRowAtIndexPath(TableView&, const IndexPath& indexPath) {
+    DriveModel& drive = _app.drive().model();
+    std::string path = pathOfRow(indexPath);
+    if (nodeAt(indexPath)->childNodes() || !drive.canPin(path))
+        return {};
+    const char* const title = drive.isPinned(path) ? "Unpin Chart" : "Pin as Chart";
+    // The pane may be gone when the menu is answered.
+    return {{title, [&drive, row = std::move(path)] { (void)drive.togglePin(row); }}};
+}
+
+void VelmoraPaneController::togglePinOfFocusRow() {
+    const IndexPath row = tableView().indexPathForFocusRow();
+    if (row.isNull() || nodeAt(row)->childNodes())
+        return;
+    (void)_app.drive().model().togglePin(pathOfRow(row));
+}
+
+std::string VelmoraPaneController::pathOfRow(const IndexPath& indexPath) const {
+    return appendingPathComponent(_keyPath, nodeAt(indexPath)->displayName());
 }
 
 const NodeRef& VelmoraPaneController::nodeAt(const IndexPath& indexPath) const {

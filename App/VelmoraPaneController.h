@@ -9,6 +9,7 @@
 #include <optional>
 #include <string>
 #include <string_view>
+#include <vector>
 
 namespace velmora {
 
@@ -40,8 +41,14 @@ public:
     [[nodiscard]] std::shared_ptr<TableCell> cellForRowAtIndexPath(TableView& tableView,
                                                                    const IndexPath& indexPath) override;
     void didSelectRowAtIndexPath(TableView& tableView, const IndexPath& indexPath) override;
+    /// A row with a number can be pinned as a chart of the drive view.
+    [[nodiscard]] std::vector<MenuItem> menuForRowAtIndexPath(TableView& tableView,
+                                                              const IndexPath& indexPath) override;
+    /// Pins the row that the keyboard is on, or takes it off.
+    void togglePinOfFocusRow();
 
 private:
+    [[nodiscard]] std::string pathOfRow(const IndexPath& indexPath) const;
     /// The row's node. Precondition: there is such a row.
     [[nodiscard]] const NodeRef& nodeAt(const IndexPath& indexPath) const;
     void resetTitle();

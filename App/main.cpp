@@ -47,6 +47,7 @@ struct Options {
     int logLevel = LogPriority::Error;
     bool isSelfTest = false;
     bool startsService = false;
+    bool beginsWithDrive = false;
     std::optional<MaskKey> maskKey;
     std::string recording;
     std::string technology;
@@ -103,6 +104,14 @@ void declare(CLI::App& app, Options& options) {
         });
     app.add_flag("--start-service", options.startsService,
                  "Start the telephony service first where none is running");
+    app.add_option_function<std::string>(
+           "--view", [&options](const std::string& name) { options.beginsWithDrive = name == "drive"; },
+           "What is shown at first: panes, or drive, which wide windows show beside the panes")
+        ->type_name("VIEW")
+        ->check([](const std::string& name) {
+            return name == "panes" || name == "drive" ? std::string()
+                                                      : '"' + name + "\", wanted panes or drive";
+        });
     app.add_flag("--self-test", options.isSelfTest, "Open every screen on the first data, then exit");
     app.footer("Velmora shows what a telephony service sends. With a synthetic drive as the service:\n"
                "  velmora-telephonyd --source scenario:gsm,seed=1 &\n"
@@ -125,6 +134,7 @@ std::optional<int> show(const Options& options, char* program) {
                    [&options] { return std::make_unique<LinuxAppPlatform>(options.files); });
     if (options.startsService)
         app.setWillConnect([] { return startTelephonyService(); });
+    app.setBeginsWithDrive(options.beginsWithDrive);
     if (options.maskKey)
         app.setMaskKey(*options.maskKey);
     if (!options.recording.empty())

@@ -138,6 +138,7 @@ void VelmoraModel::destroyPorts() {
 
 void VelmoraModel::forget() {
     destroyPorts();
+    decoderWillChange(nullptr);
     _logGenerator.reset();
     _state = Dictionary();
     _technologies = DisplayTechnology();
@@ -154,7 +155,9 @@ void VelmoraModel::configureGenerator() {
     }
     // An answer that is no string equals no technology, like an unknown name.
     const std::string* name = technology->asString();
-    _logGenerator = name ? generatorFromTechnology(*name) : nullptr;
+    std::unique_ptr<LogGenerator> next = name ? generatorFromTechnology(*name) : nullptr;
+    decoderWillChange(next.get());
+    _logGenerator = std::move(next);
     if (_logGenerator)
         _technologies.setDecoder(*name, _state);
     else

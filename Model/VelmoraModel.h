@@ -112,6 +112,9 @@ public:
 protected:
     /// Picks the decoder for the technology that the service named.
     [[nodiscard]] virtual std::unique_ptr<LogGenerator> generatorFromTechnology(std::string_view technology);
+    /// The decoder is about to be replaced by that one, or removed (null); the earlier one still exists. The
+    /// default does nothing.
+    virtual void decoderWillChange(LogGenerator* /*next*/) {}
 
 private:
     [[nodiscard]] bool openLogChannel(const std::string& name);

@@ -56,6 +56,25 @@ void Button::setEnabled(bool isEnabled) {
     _button->setEnabled(isEnabled);
 }
 
+void Button::setTogglable(bool isTogglable) {
+    _button->setCheckable(isTogglable);
+    // Some palettes have hardly another colour for it.
+    QObject::connect(_button, &QPushButton::toggled, _button, [button = _button](bool isOn) {
+        QFont font = button->font();
+        font.setBold(isOn);
+        font.setUnderline(isOn);
+        button->setFont(font);
+    });
+}
+
+bool Button::isOn() const {
+    return _button->isChecked();
+}
+
+void Button::setOn(bool isOn) {
+    _button->setChecked(isOn);
+}
+
 void Button::press() {
     _button->click();
 }

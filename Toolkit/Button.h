@@ -26,6 +26,10 @@ public:
     [[nodiscard]] std::string title() const;
     [[nodiscard]] ButtonRole role() const;
     void setEnabled(bool isEnabled);
+    /// A button that is on or off, which each press changes before its action. Off at first.
+    void setTogglable(bool isTogglable);
+    [[nodiscard]] bool isOn() const;
+    void setOn(bool isOn);
     /// Does what a click does, unless the button is disabled.
     void press();
     /// Wide enough for the title, high enough for a finger.

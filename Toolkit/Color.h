@@ -12,7 +12,11 @@ enum class Color {
     clear,     ///< transparent
     darkText,  ///< text on the ordinary ground: dark on a light palette, light on a dark one
     secondary, ///< secondary text
-    ground     ///< the ordinary ground
+    ground,    ///< the ordinary ground
+    poor,      ///< text and bars of something that is so good, always with a word beside the colour
+    fair,
+    good,
+    excellent
 };
 
 } // namespace velmora

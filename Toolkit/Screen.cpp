@@ -15,7 +15,10 @@ namespace velmora {
 
 namespace {
 
+/// That of a phone and, where the screen is a desktop's, one that has room for two screens side by side.
 constexpr QSize usual(390, 844);
+constexpr QSize usualOnDesktop(1120, 844);
+constexpr int leastWidthOfDesktop = 1200;
 
 } // namespace
 
@@ -25,7 +28,9 @@ Rect Screen::mainBounds() {
         return fromQt(QRect({0, 0}, usual));
     const QString platform = QGuiApplication::platformName();
     const bool isDevice = platform.startsWith("eglfs") || platform.startsWith("linuxfb");
-    return fromQt(QRect({0, 0}, isDevice ? screen->size() : usual.boundedTo(screen->availableSize())));
+    const QSize available = screen->availableSize();
+    const QSize window = available.width() >= leastWidthOfDesktop ? usualOnDesktop : usual;
+    return fromQt(QRect({0, 0}, isDevice ? screen->size() : window.boundedTo(available)));
 }
 
 Rect Screen::mainApplicationFrame() {

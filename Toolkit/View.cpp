@@ -126,6 +126,10 @@ void View::setHidden(bool isHidden) {
         _state->widget->setVisible(!isHidden);
 }
 
+bool View::isOnScreen() const {
+    return _state->widget->isVisible() && !_state->widget->window()->isMinimized();
+}
+
 void View::setBackgroundColor(Color color) {
     _state->widget->setAutoFillBackground(color != Color::clear && color != Color::automatic);
     _state->widget->setBackgroundRole(toQt(color, QPalette::NoRole));

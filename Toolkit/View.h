@@ -48,6 +48,8 @@ public:
 
     [[nodiscard]] bool isHidden() const;
     void setHidden(bool isHidden);
+    /// Whether it can be seen: it is in a window on the screen that is not minimized.
+    [[nodiscard]] bool isOnScreen() const;
     void setBackgroundColor(Color color);
 
     /// Called for a tap or click on the view that none of its subviews takes.

@@ -3,6 +3,7 @@
 
 #include "Analysis/Rules/RuleSet.h"
 
+#include "Analysis/Rules/Files/ClassReader.h"
 #include "Analysis/Rules/Files/RuleReader.h"
 #include "Analysis/Rules/Files/TOMLReader.h"
 #include "Analysis/Rules/Rule.h"
@@ -56,6 +57,17 @@ void RuleSet::add(const RuleFile& file) {
         if (std::string mistake = insert(std::move(rule)); !mistake.empty())
             errors.add(position, std::move(mistake));
     }
+    addClasses(file, std::get<TOMLNode>(document));
+}
+
+void RuleSet::addClasses(const RuleFile& file, const TOMLNode& document) {
+    FileErrors errors(file.name, file.text, file.isBuiltIn ? _leftOutClasses : _errors);
+    for (const ClassReader::Class& each : ClassReader(_catalogues, errors).read(document))
+        for (const LevelClasses::Subject& subject : each.subjects)
+            if (std::string mistake =
+                    _classes.add(subject, each.limits, {file.name, each.position.line, file.layer});
+                !mistake.empty())
+                errors.add(each.position, std::move(mistake));
 }
 
 std::string RuleSet::insert(Rule rule) {

@@ -3,6 +3,7 @@
 
 #pragma once
 
+#include "Analysis/Classes/LevelClasses.h"
 #include "Analysis/Engine/Detector.h"
 #include "Analysis/Events/Event.h"
 #include "Analysis/Rules/RuleError.h"
@@ -19,6 +20,7 @@
 namespace velmora {
 
 struct Rule;
+struct TOMLNode;
 
 /// A rule file's content and where it is from.
 struct RuleFile {
@@ -33,7 +35,7 @@ struct RuleFile {
 };
 
 /// The rules of several files, checked against the catalogues of all technologies. A rule with a mistake is
-/// not in it; the others of its file are.
+/// not in it; the others of its file are. The files' classes of levels come with them.
 class RuleSet {
 public:
     /// What is known of a rule without evaluating it.
@@ -51,7 +53,7 @@ public:
     RuleSet(RuleSet&&) noexcept;
     RuleSet& operator=(RuleSet&&) noexcept;
 
-    /// Adds the rules of a file.
+    /// Adds the rules and classes of a file.
     void add(const RuleFile& file);
     /// Adds the mistake of a file that could not be read.
     void addError(RuleError error) { _errors.push_back(std::move(error)); }
@@ -60,6 +62,9 @@ public:
     [[nodiscard]] const std::vector<RuleError>& errors() const { return _errors; }
     /// The rules of built-in files that are left out, with the reason.
     [[nodiscard]] const std::vector<RuleError>& leftOut() const { return _leftOut; }
+    /// The same of classes.
+    [[nodiscard]] const std::vector<RuleError>& leftOutClasses() const { return _leftOutClasses; }
+    [[nodiscard]] const LevelClasses& classes() const { return _classes; }
     /// By name; of several rules of one name that of the first.
     [[nodiscard]] std::vector<Summary> summaries() const;
     /// By name.
@@ -73,11 +78,14 @@ public:
 private:
     /// Why the rule is not added; empty where it is, or where one of a higher layer replaces it.
     std::string insert(Rule rule);
+    void addClasses(const RuleFile& file, const TOMLNode& document);
 
     std::vector<const Catalogue*> _catalogues;
     std::vector<std::shared_ptr<const Rule>> _rules; ///< by name
     std::vector<RuleError> _errors;
     std::vector<RuleError> _leftOut;
+    std::vector<RuleError> _leftOutClasses;
+    LevelClasses _classes;
 };
 
 /// Finds the events of the rules in what the messages of a technology report. Rules that use nothing that the

@@ -40,6 +40,10 @@ _velmora() {
         _filedir -d
         return
         ;;
+    --view)
+        _velmora_offer panes drive
+        return
+        ;;
     --mask-key)
         _filedir
         return
@@ -51,7 +55,7 @@ _velmora() {
     esac
     $split && return
     case $cur in
-    -*) _velmora_offer -h --help --version --sysroot --log-directory --start-service --mask-key --technology --self-test --log --log-level ;;
+    -*) _velmora_offer -h --help --version --sysroot --log-directory --start-service --mask-key --view --technology --self-test --log --log-level ;;
     *) _filedir ;;
     esac
 }

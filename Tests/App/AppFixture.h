@@ -42,6 +42,7 @@ public:
     }
     [[nodiscard]] FileSystem& files() override { return linuxFiles; }
     [[nodiscard]] Preferences& preferences() override { return fakePreferences; }
+    [[nodiscard]] std::vector<RuleFile> ruleFiles() override { return rules; }
 
     FakeClock clock;
     FakeMainQueue queue{clock};
@@ -49,6 +50,7 @@ public:
     FakeTelephonyService telephony;
     FakePreferences fakePreferences;
     LinuxFileSystem linuxFiles;
+    std::vector<RuleFile> rules;
 };
 
 /// The application on the real toolkit, with a service that the test plays. The service speaks the technology

@@ -174,9 +174,9 @@ TEST_F(VelmoraProcessTest, HelpShowsTheOptionsAndAnExample) {
     const auto app = start("velmora", {"--help"});
     EXPECT_EQ(exitStatus(*app), 0);
     const std::string help = text("velmora.out");
-    for (const char* part :
-         {"--sysroot", "VELMORA_SYSROOT", "--log-directory", "VELMORA_LOG_DIRECTORY", "--log ", "--log-level",
-          "--self-test", "--start-service", "--version", "velmora-telephonyd --source scenario:gsm,seed=1"})
+    for (const char* part : {"--sysroot", "VELMORA_SYSROOT", "--log-directory", "VELMORA_LOG_DIRECTORY",
+                             "--log ", "--log-level", "--self-test", "--start-service", "--view ",
+                             "--version", "velmora-telephonyd --source scenario:gsm,seed=1"})
         EXPECT_THAT(help, HasSubstr(part));
 }
 

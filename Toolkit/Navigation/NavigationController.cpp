@@ -42,8 +42,14 @@ std::unique_ptr<View> NavigationController::loadView() {
     auto stack = std::make_unique<NavigationView>();
     QObject::connect(&stack->header().backButton(), &QAbstractButton::clicked, &stack->header(), [this] {
         const auto self = shared_from_this();
-        popViewController(true);
+        goBack();
     });
+    QObject::connect(&stack->header().commandButton(), &QAbstractButton::clicked, &stack->header(), [this] {
+        const std::function<void()> action = _headerCommand.action; // the call may set another one
+        if (action)
+            action();
+    });
+    stack->header().setCommand(toQt(_headerCommand.title));
     stack->setToolbarHidden(_isToolbarHidden);
     stack->setNotice(_notice);
     stack->setAccessories(_accessories);
@@ -100,6 +106,26 @@ void NavigationController::setAccessories(std::vector<View*> views) {
         stackView().setAccessories(_accessories);
 }
 
+void NavigationController::setHeaderCommand(std::string title, std::function<void()> action) {
+    _headerCommand = {std::move(title), std::move(action)};
+    if (isViewLoaded())
+        stackView().header().setCommand(toQt(_headerCommand.title));
+}
+
+void NavigationController::setLeave(std::string title, std::function<void()> action) {
+    _leave = {std::move(title), std::move(action)};
+    if (_isOnScreen)
+        fillBars(false);
+}
+
+void NavigationController::goBack() {
+    if (popViewController(true) || _leave.title.empty())
+        return;
+    const std::function<void()> action = _leave.action; // the call may set another one
+    if (action)
+        action();
+}
+
 void NavigationController::showTop(const std::shared_ptr<ViewController>& old, bool isPush, bool animated) {
     if (!_isOnScreen) { // it is announced as the stack comes onto the screen
         if (isViewLoaded())
@@ -135,9 +161,10 @@ void NavigationController::fillBars(bool /*animated*/) {
     NavigationView& stack = stackView();
     stack.header().setTitle(toQt(top.title()));
     const bool hasBack = _panes.size() > 1;
-    stack.header().setBack(hasBack, hasBack ? toQt(_panes[_panes.size() - 2]->title()) : QString());
+    stack.header().setBack(hasBack || !_leave.title.empty(),
+                           toQt(hasBack ? _panes[_panes.size() - 2]->title() : _leave.title));
     stack.toolbar().setItems(top.toolbarItems());
-    if (auto* const window = dynamic_cast<WindowWidget*>(stack.widget()->window()))
+    if (auto* const window = dynamic_cast<WindowWidget*>(stack.widget()->window()); window && _namesWindow)
         window->setWindowTitle(toQt(top.title()));
 }
 
@@ -174,7 +201,7 @@ bool NavigationController::becomeFirstResponder() {
 }
 
 void NavigationController::cancelOperation() {
-    popViewController(true);
+    goBack();
 }
 
 void NavigationController::saveOperation() {

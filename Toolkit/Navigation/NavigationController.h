@@ -7,7 +7,9 @@
 #include "Toolkit/Navigation/ViewController.h"
 #include "Toolkit/Notice.h"
 
+#include <functional>
 #include <memory>
+#include <string>
 #include <vector>
 
 namespace velmora {
@@ -53,6 +55,14 @@ public:
     /// Views between pane and toolbar, on whatever pane, the first on top; none at first. Not owned.
     void setAccessories(std::vector<View*> views);
 
+    /// A button in the header of every pane; none at first, and for an empty title.
+    void setHeaderCommand(std::string title, std::function<void()> action);
+    /// What the back button leads to from the root pane, and how; without a title there is none. Escape and
+    /// the like do the same.
+    void setLeave(std::string title, std::function<void()> action);
+    /// Whether the top pane's title is also the window's; it is at first.
+    void setNamesWindow(bool namesWindow) { _namesWindow = namesWindow; }
+
     void viewWillAppear(bool animated) override;
     void viewDidAppear(bool animated) override;
     void viewWillDisappear(bool animated) override;
@@ -79,8 +89,19 @@ private:
 
     std::vector<std::shared_ptr<ViewController>> _panes;
     NavigationControllerDelegate* _delegate = nullptr;
+    /// A title and what it does.
+    struct Command {
+        std::string title;
+        std::function<void()> action;
+    };
+
+    void goBack();
+
     Notice _notice;
     std::vector<View*> _accessories;
+    Command _headerCommand;
+    Command _leave;
+    bool _namesWindow = true;
     bool _isToolbarHidden = true;
     bool _isOnScreen = false;
 };

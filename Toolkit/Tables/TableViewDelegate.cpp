@@ -7,4 +7,9 @@ namespace velmora {
 
 void TableViewDelegate::didSelectRowAtIndexPath(TableView& /*tableView*/, const IndexPath& /*indexPath*/) {}
 
+std::vector<MenuItem> TableViewDelegate::menuForRowAtIndexPath(TableView& /*tableView*/,
+                                                               const IndexPath& /*indexPath*/) {
+    return {};
+}
+
 } // namespace velmora

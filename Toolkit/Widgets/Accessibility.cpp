@@ -5,6 +5,8 @@
 
 #include "Toolkit/Tables/TableCell.h"
 #include "Toolkit/Tables/TableView.h"
+#include "Toolkit/Widgets/Charts/ChartAccessible.h"
+#include "Toolkit/Widgets/Charts/ChartWidget.h"
 #include "Toolkit/Widgets/Conversions.h"
 #include "Toolkit/Widgets/HeaderBar.h"
 #include "Toolkit/Widgets/SheetWidget.h"
@@ -128,6 +130,8 @@ QAccessibleInterface* makeInterface(const QString& /*className*/, QObject* objec
         return new QAccessibleWidget(sheet, QAccessible::Dialog);
     if (auto* const spinner = dynamic_cast<SpinnerWidget*>(object))
         return new SpinnerAccessible(*spinner);
+    if (auto* const chart = dynamic_cast<ChartWidget*>(object))
+        return new ChartAccessible(*chart);
     return nullptr;
 }
 

@@ -54,9 +54,25 @@ QPalette::ColorRole toQt(Color color, QPalette::ColorRole otherwise) {
     case Color::secondary: return QPalette::PlaceholderText;
     case Color::ground: return QPalette::Window;
     case Color::automatic:
-    case Color::clear: break;
+    case Color::clear:
+    case Color::poor:
+    case Color::fair:
+    case Color::good:
+    case Color::excellent: break;
     }
     return otherwise;
+}
+
+QColor colorOf(Color color, const QPalette& palette, QPalette::ColorRole otherwise) {
+    // Each has a contrast of at least 4.5:1 to a white or a dark ground.
+    const bool isDark = palette.color(QPalette::Window).lightness() < 128;
+    switch (color) {
+    case Color::poor: return isDark ? QColor(255, 138, 128) : QColor(179, 38, 30);
+    case Color::fair: return isDark ? QColor(255, 192, 77) : QColor(138, 84, 0);
+    case Color::good: return isDark ? QColor(125, 220, 139) : QColor(27, 110, 46);
+    case Color::excellent: return isDark ? QColor(108, 199, 255) : QColor(0, 92, 148);
+    default: return palette.color(toQt(color, otherwise));
+    }
 }
 
 } // namespace velmora

@@ -26,6 +26,8 @@ namespace velmora {
 /// On whole points, and no narrower or lower than the rectangle.
 [[nodiscard]] QRect toQt(const Rect& rect);
 [[nodiscard]] Rect fromQt(const QRect& rect);
+/// The colour in that palette, light or dark; that of the role for the automatic colour.
+[[nodiscard]] QColor colorOf(Color color, const QPalette& palette, QPalette::ColorRole otherwise);
 /// The palette's role for a colour; `otherwise` for the automatic one and for none.
 [[nodiscard]] QPalette::ColorRole toQt(Color color, QPalette::ColorRole otherwise);
 

@@ -71,7 +71,48 @@ void BackButton::keyPressEvent(QKeyEvent* event) {
         QAbstractButton::keyPressEvent(event);
 }
 
-HeaderBar::HeaderBar() : _back(new BackButton(this)), _title(new HeadingLabel) {
+HeaderButton::HeaderButton(QWidget* parent) : QAbstractButton(parent) {
+    setObjectName("velmora.headerButton");
+    setFont(toQt(Font::systemFontOfSize(15)));
+    setFocusPolicy(Qt::TabFocus);
+    setAttribute(Qt::WA_Hover);
+}
+
+QSize HeaderButton::sizeHint() const {
+    const double advance = QFontMetricsF(font()).horizontalAdvance(text());
+    return {std::max(static_cast<int>(std::ceil(advance)) + 20, 44), 44};
+}
+
+void HeaderButton::paintEvent(QPaintEvent* /*event*/) {
+    QPainter painter(this);
+    const QColor ink = palette().color(QPalette::WindowText);
+    QColor ground = ink;
+    ground.setAlphaF(isDown() ? 0.2F : underMouse() ? 0.14F : isChecked() ? 0.12F : 0.06F);
+    painter.setRenderHint(QPainter::Antialiasing);
+    painter.setPen(Qt::NoPen);
+    painter.setBrush(ground);
+    painter.drawRoundedRect(QRectF(rect()).adjusted(0, 6, 0, -6), 6, 6);
+    painter.setPen(ink);
+    painter.drawText(rect(), static_cast<int>(Qt::AlignCenter) | Qt::TextSingleLine,
+                     QFontMetricsF(font()).elidedText(text(), Qt::ElideRight, width()));
+    if (hasFocus()) {
+        QStyleOptionFocusRect option;
+        option.initFrom(this);
+        option.backgroundColor = palette().color(QPalette::Window);
+        option.state |= QStyle::State_KeyboardFocusChange;
+        style()->drawPrimitive(QStyle::PE_FrameFocusRect, &option, &painter, this);
+    }
+}
+
+void HeaderButton::keyPressEvent(QKeyEvent* event) {
+    if (event->key() == Qt::Key_Return || event->key() == Qt::Key_Enter)
+        click();
+    else
+        QAbstractButton::keyPressEvent(event);
+}
+
+HeaderBar::HeaderBar()
+    : _back(new BackButton(this)), _command(new HeaderButton(this)), _title(new HeadingLabel) {
     setObjectName("velmora.header");
     setAutoFillBackground(true);
     _title->setParent(this);
@@ -80,6 +121,14 @@ HeaderBar::HeaderBar() : _back(new BackButton(this)), _title(new HeadingLabel) {
     _title->setAlignment(Qt::AlignCenter);
     _title->setElideMode(Qt::ElideMiddle);
     _back->hide();
+    _command->hide();
+}
+
+void HeaderBar::setCommand(const QString& title) {
+    _command->setText(title);
+    _command->setAccessibleName(title);
+    _command->setVisible(!title.isEmpty());
+    layoutParts();
 }
 
 void HeaderBar::setTitle(const QString& title) {
@@ -100,11 +149,14 @@ void HeaderBar::layoutParts() {
     // beside the way back otherwise.
     const int back = _back->isHidden() ? 0 : std::min(_back->sizeHint().width(), std::max(width() / 3, 44));
     _back->setGeometry(4, (height() - 44) / 2, back, 44);
+    const int command = _command->isHidden() ? 0 : std::min(_command->sizeHint().width(), width() / 3);
+    _command->setGeometry(width() - command - 8, (height() - 44) / 2, command, 44);
     const int left = back > 0 ? back + 12 : 12;
+    const int right = command > 0 ? command + 16 : 12;
     const int wanted = _title->sizeHint().width();
-    const int room = std::max(width() - left - 12, 0);
+    const int room = std::max(width() - left - right, 0);
     const int middle = (width() - wanted) / 2;
-    const bool fits = middle >= left;
+    const bool fits = middle >= std::max(left, right);
     _title->setGeometry(fits ? middle : left, 0, fits ? wanted : room, height());
 }
 

@@ -21,6 +21,17 @@ protected:
     void keyPressEvent(QKeyEvent* event) override;
 };
 
+/// A command of the screen, at the right edge of the bar.
+class HeaderButton : public QAbstractButton {
+public:
+    explicit HeaderButton(QWidget* parent);
+    [[nodiscard]] QSize sizeHint() const override;
+
+protected:
+    void paintEvent(QPaintEvent* event) override;
+    void keyPressEvent(QKeyEvent* event) override;
+};
+
 /// The title of a screen, which a screen reader takes for a heading.
 class HeadingLabel : public LabelWidget {};
 
@@ -33,6 +44,9 @@ public:
     void setTitle(const QString& title);
     /// Shows the way back to a screen of that title.
     void setBack(bool isShown, const QString& title);
+    [[nodiscard]] HeaderButton& commandButton() { return *_command; }
+    /// Shows a button of that title; none for an empty one.
+    void setCommand(const QString& title);
 
 protected:
     void paintEvent(QPaintEvent* event) override;
@@ -42,6 +56,7 @@ private:
     void layoutParts();
 
     BackButton* _back;
+    HeaderButton* _command;
     HeadingLabel* _title;
 };
 

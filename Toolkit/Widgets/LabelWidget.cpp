@@ -49,7 +49,8 @@ QColor LabelWidget::shownColor() const {
     if (_color == Color::clear)
         return Qt::transparent;
     const bool isOnHighlight = _color == Color::automatic && CellWidget::isOnHighlight(*this);
-    return palette().color(isOnHighlight ? QPalette::HighlightedText : toQt(_color, QPalette::WindowText));
+    return isOnHighlight ? palette().color(QPalette::HighlightedText)
+                         : colorOf(_color, palette(), QPalette::WindowText);
 }
 
 void LabelWidget::paintEvent(QPaintEvent* /*event*/) {

@@ -24,6 +24,7 @@ struct FileCounts {
     std::size_t rules = 0;
     std::size_t tests = 0;
     std::size_t passed = 0;
+    std::size_t classes = 0;
 };
 
 std::string counted(std::size_t count, const std::string& noun) {
@@ -54,7 +55,11 @@ std::string lineOf(const std::string& file, const FileCounts& counts, RulesOptio
     if (action == RulesOptions::Action::Test)
         line += std::to_string(counts.passed) + " of ";
     line += counted(counts.tests, "test");
-    return line + (action == RulesOptions::Action::Test ? " passed\n" : "\n");
+    if (action == RulesOptions::Action::Test)
+        line += " passed";
+    if (counts.classes > 0)
+        line += ", classes of " + counted(counts.classes, "value");
+    return line + "\n";
 }
 
 } // namespace
@@ -68,6 +73,8 @@ int runRules(const RulesOptions& options, Output& output) {
         report(printableLine(each.message()));
     for (const RuleError& each : rules.leftOut())
         report(printableLine(each.message()) + "; the rule is left out");
+    for (const RuleError& each : rules.leftOutClasses())
+        report(printableLine(each.message()) + "; the class is left out");
     bool isRight = rules.errors().empty();
 
     std::map<std::string, FileCounts> counts;
@@ -83,8 +90,10 @@ int runRules(const RulesOptions& options, Output& output) {
             isRight = isRight && hasPassed;
         }
     }
-    for (const RulePath& each : paths)
+    for (const RulePath& each : paths) {
+        counts[each.path].classes = rules.classes().countFrom(each.path);
         output.put(lineOf(each.path, counts[each.path], options.action));
+    }
     output.flush();
     return isRight && output.state() != Output::State::Failed ? ExitStatus::Done : ExitStatus::BadInput;
 }

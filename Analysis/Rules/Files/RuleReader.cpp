@@ -35,7 +35,7 @@ bool isKindName(std::string_view name) {
 } // namespace
 
 std::vector<Rule> RuleReader::read(const TOMLNode& document) {
-    static constexpr std::array<std::string_view, 1> keys{"rule"};
+    static constexpr std::array<std::string_view, 2> keys{"rule", "class"}; // classes have their own reader
     std::vector<Rule> rules;
     TableReader top(document, keys, _errors);
     const TOMLNode* const all = top.find("rule", TOMLNode::Kind::Array);

@@ -40,7 +40,7 @@ TEST(RuleFileTest, AnUnknownKeyIsAMistakeAtItsPlace) {
     EXPECT_THAT(mistakesIn(valid + "  hold = \"5s\"\n"),
                 ElementsAre("my.toml:5:3: got the key hold, wanted one like for, keep, name"));
     EXPECT_THAT(mistakesIn("rules = 3\n"),
-                ElementsAre("my.toml:1:1: got the key rules, wanted one like rule"));
+                ElementsAre("my.toml:1:1: got the key rules, wanted one like rule, class"));
 }
 
 TEST(RuleFileTest, AMistakeOfAnExpressionIsAtItsPlaceInTheFile) {

@@ -47,6 +47,24 @@ TEST_F(RulesCommandTest, CheckCountsRulesAndTests) {
     EXPECT_EQ(ownMessages(process.errors()), "");
 }
 
+TEST_F(RulesCommandTest, CheckCountsTheValuesThatHaveClasses) {
+    write("my.toml", "[[class]]\nvalue = \"serving.level\"\nradio-technology = [\"LTE\", \"NR\"]\n"
+                     "fair = -120\ngood = -105\nexcellent = -90\n");
+    ToolProcess process(shipped({"rules", "check", path("my.toml")}));
+    EXPECT_EQ(process.exitStatus(), 0);
+    EXPECT_EQ(process.output(), path("my.toml") + ": 0 rules, 0 tests, classes of 2 values\n");
+}
+
+TEST_F(RulesCommandTest, CheckReportsMistakesInClassesWithTheirPlace) {
+    write("my.toml", "[[class]]\nvalue = \"serving.level\"\nradio-technology = \"LTE\"\n"
+                     "fair = -90\ngood = -105\nexcellent = -80\n");
+    ToolProcess process(shipped({"rules", "check", path("my.toml")}));
+    EXPECT_EQ(process.exitStatus(), 1);
+    EXPECT_EQ(ownMessages(process.errors()),
+              "velmora-log: " + path("my.toml") +
+                  ":5:8: got limits that do not ascend, wanted fair below good\n");
+}
+
 TEST_F(RulesCommandTest, CheckReportsMistakesWithTheirPlace) {
     write("my.toml", rule("a", "-110 dB", 1) + rule("b", "-100", 1));
     ToolProcess process(shipped({"rules", "check", path("my.toml"), path("none.toml")}));

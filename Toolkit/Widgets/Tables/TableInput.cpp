@@ -8,6 +8,7 @@
 #include "Toolkit/Widgets/Tables/TableWidget.h"
 #include "Toolkit/Widgets/TouchScroll.h"
 
+#include <QContextMenuEvent>
 #include <QKeyEvent>
 #include <QMouseEvent>
 #include <QScrollBar>
@@ -16,6 +17,7 @@
 #include <QTouchEvent>
 
 #include <algorithm>
+#include <chrono>
 #include <cmath>
 
 namespace velmora {
@@ -23,10 +25,15 @@ namespace velmora {
 namespace {
 
 constexpr double sidewaysStep = 60;
+constexpr std::chrono::milliseconds longPress{600};
 
 } // namespace
 
-TableInput::TableInput(TableWidget& table) : _table(table) {}
+TableInput::TableInput(TableWidget& table) : _table(table) {
+    _longPress.setSingleShot(true);
+    _longPress.setInterval(longPress);
+    QObject::connect(&_longPress, &QTimer::timeout, &_longPress, [this] { pressedLong(); });
+}
 
 TableInput::~TableInput() = default;
 
@@ -43,6 +50,7 @@ bool TableInput::handle(QEvent* event) {
         const auto* const mouse = static_cast<QMouseEvent*>(event);
         return mouse->button() == Qt::LeftButton && press(mouse->position().toPoint());
     }
+    case QEvent::ContextMenu: return openMenu(*static_cast<QContextMenuEvent*>(event));
     case QEvent::MouseButtonDblClick: return true; // out of habit; one click is all that it takes
     case QEvent::MouseButtonRelease: {
         const auto* const mouse = static_cast<QMouseEvent*>(event);
@@ -88,7 +96,8 @@ void TableInput::touch(const QTouchEvent& event) {
     const QPoint place = _table.viewport()->mapFromGlobal(event.points().first().globalPosition()).toPoint();
     if (event.type() == QEvent::TouchBegin && !isScroll) {
         _table.setFocus(Qt::MouseFocusReason);
-        (void)press(place);
+        if (press(place))
+            _longPress.start();
     } else if (event.type() == QEvent::TouchEnd) {
         (void)release(place);
     }
@@ -96,6 +105,7 @@ void TableInput::touch(const QTouchEvent& event) {
 
 bool TableInput::press(const QPoint& place) {
     _pressed = _table.rowAt(place);
+    _pressPlace = place;
     _table.setShowsFocus(false);
     _table.setPressedRow(_pressed);
     return _pressed.has_value();
@@ -113,10 +123,27 @@ bool TableInput::release(const QPoint& place) {
 }
 
 void TableInput::cancelPress() {
+    _longPress.stop();
     if (!_pressed)
         return;
     _pressed.reset();
     _table.setPressedRow(std::nullopt);
+}
+
+bool TableInput::openMenu(const QContextMenuEvent& event) {
+    const bool isByKey = event.reason() == QContextMenuEvent::Keyboard;
+    const std::optional<std::size_t> row = isByKey ? _table.focusRow() : _table.rowAt(event.pos());
+    if (!row)
+        return false;
+    _table.openMenu(*row, isByKey ? _table.rowRect(*row).center() : event.pos());
+    return true;
+}
+
+void TableInput::pressedLong() {
+    const std::optional<std::size_t> row = _pressed;
+    cancelPress();
+    if (row)
+        _table.openMenu(*row, _pressPlace);
 }
 
 void TableInput::handleKey(QKeyEvent* event) {

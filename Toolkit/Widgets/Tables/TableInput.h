@@ -3,15 +3,17 @@
 
 #pragma once
 
+#include <QPoint>
 #include <QPointF>
 #include <QPointer>
+#include <QTimer>
 
 #include <cstddef>
 #include <optional>
 
+class QContextMenuEvent;
 class QEvent;
 class QKeyEvent;
-class QPoint;
 class QTouchEvent;
 
 namespace velmora {
@@ -29,18 +31,23 @@ public:
     /// An event of the viewport; true when it was used.
     [[nodiscard]] bool handle(QEvent* event);
     void handleKey(QKeyEvent* event);
+    /// Whether there is a row that it is for.
+    [[nodiscard]] bool openMenu(const QContextMenuEvent& event);
 
 private:
     void touch(const QTouchEvent& event);
     [[nodiscard]] bool press(const QPoint& place);
     [[nodiscard]] bool release(const QPoint& place);
     void cancelPress();
+    void pressedLong();
     [[nodiscard]] bool moveFocus(int key);
     [[nodiscard]] bool scrollSideways(int direction);
 
     TableWidget& _table;
     std::optional<std::size_t> _pressed;
     QPointer<ScrollWidget> _underTouch;
+    QPoint _pressPlace;
+    QTimer _longPress; ///< of a finger
 };
 
 } // namespace velmora

@@ -10,8 +10,10 @@
 #include "Toolkit/Widgets/ScrollWidget.h"
 #include "Toolkit/Widgets/Tables/CellWidget.h"
 
+#include <QContextMenuEvent>
 #include <QFocusEvent>
 #include <QFontMetricsF>
+#include <QMenu>
 #include <QPointer>
 #include <QScrollBar>
 
@@ -154,6 +156,19 @@ void TableWidget::activateRow(std::size_t row) {
         delegate->didSelectRowAtIndexPath(*view, _rows.path(row));
 }
 
+void TableWidget::openMenu(std::size_t row, const QPoint& place) {
+    const std::vector<MenuItem> items =
+        delegate && view ? delegate->menuForRowAtIndexPath(*view, _rows.path(row)) : std::vector<MenuItem>();
+    if (items.empty())
+        return;
+    auto* const menu = new QMenu(this);
+    menu->setObjectName("velmora.menu");
+    menu->setAttribute(Qt::WA_DeleteOnClose);
+    for (const MenuItem& each : items)
+        connect(menu->addAction(toQt(each.title)), &QAction::triggered, this, each.action);
+    menu->popup(viewport()->mapToGlobal(place));
+}
+
 void TableWidget::layoutRows() {
     if (!view || _isLayingOut)
         return;
@@ -254,6 +269,10 @@ bool TableWidget::viewportEvent(QEvent* event) {
 
 void TableWidget::keyPressEvent(QKeyEvent* event) {
     _input.handleKey(event);
+}
+
+void TableWidget::contextMenuEvent(QContextMenuEvent* event) {
+    event->setAccepted(_input.openMenu(*event));
 }
 
 void TableWidget::focusInEvent(QFocusEvent* event) {

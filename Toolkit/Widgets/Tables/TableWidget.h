@@ -60,6 +60,8 @@ public:
     void setShowsFocus(bool shows);
     void scrollToRow(std::size_t row);
     /// Selects the row and notifies the delegate, which may destroy the table.
+    /// Opens the row's menu, if it has one, at that place of the viewport.
+    void openMenu(std::size_t row, const QPoint& place);
     void activateRow(std::size_t row);
 
 protected:
@@ -68,6 +70,7 @@ protected:
     void scrollContentsBy(int dx, int dy) override;
     bool viewportEvent(QEvent* event) override;
     void keyPressEvent(QKeyEvent* event) override;
+    void contextMenuEvent(QContextMenuEvent* event) override;
     void focusInEvent(QFocusEvent* event) override;
     void focusOutEvent(QFocusEvent* event) override;
     void changeEvent(QEvent* event) override;

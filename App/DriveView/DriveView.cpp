@@ -1,0 +1,100 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
+#include "App/DriveView/DriveView.h"
+
+#include "Analysis/Events/EventKind.h"
+#include "App/DriveView/DriveText.h"
+#include "App/DriveView/NeighbourRows.h"
+
+#include <algorithm>
+#include <cmath>
+#include <utility>
+
+namespace velmora {
+
+namespace {
+
+constexpr double margin = 12;
+constexpr double headingSize = 15;
+constexpr double gap = 6;
+constexpr std::size_t neighbourRowsShown = 6;
+constexpr std::size_t eventRowsShown = 5;
+
+} // namespace
+
+DriveView::DriveView(const DriveModel& model, const DriveHistory& history, const Clock& clock)
+    : _model(model), _charts(model, history), _events(model, clock), _clock(clock) {
+    setAccessibleName("Drive");
+    _neighbours.setAccessibleName("Neighbours");
+    _neighbours.setPlaceholder("No neighbour cells have been reported.");
+    _neighbours.setColumns(neighbourColumns({}));
+    addSubview(_now);
+    for (Label* each : {&_neighboursHeading, &_chartsHeading, &_eventsHeading})
+        each->setFont(Font::boldSystemFontOfSize(headingSize));
+    addSubview(_neighboursHeading);
+    addSubview(_neighbours);
+    addSubview(_chartsHeading);
+    addSubview(_charts);
+    addSubview(_eventsHeading);
+    addSubview(_events);
+    _events.setOnChoose([this](Time time) {
+        _charts.showMoment(time);
+        setContentOffset(_chartsHeading.frame().y);
+    });
+}
+
+DriveView::~DriveView() = default;
+
+void DriveView::update(Time now, std::string_view link) {
+    const DriveNow known = _model.now();
+    std::string change;
+    for (const Event& each : _model.events()) {
+        if (each.kind == rowOf(EventKind::Malformed).name)
+            continue; // says nothing about the network
+        change = clockText(each.time, _clock) + ' ' + (each.text.empty() ? each.kind : each.text);
+        break;
+    }
+    _now.show(known, _model.classes(), now, link, change);
+    if (std::exchange(_columnsOf, known.technology) != known.technology)
+        _neighbours.setColumns(neighbourColumns(known.technology));
+    _neighbours.setRows(neighbourRows(_model.neighbours(), known, _model.classes(), now));
+    _events.update();
+}
+
+void DriveView::updateCharts(Time now) {
+    _charts.update(now);
+    if (std::exchange(_panels, _charts.chart().panelCount()) != _charts.chart().panelCount())
+        layoutSubviews();
+}
+
+void DriveView::layoutSubviews() {
+    const double width = contentWidth();
+    const double heading = std::ceil(sizeOfText("X", _neighboursHeading.font()).height) + gap;
+    double charts = _charts.wantedHeight(width);
+    double events = _events.heightOfRows(eventRowsShown);
+    const double above =
+        _now.heightForWidth(width) + heading + _neighbours.heightOfRows(neighbourRowsShown) + gap;
+    const double needed = above + heading + charts + gap + heading + events;
+    if (const double spare = bounds().height - needed; spare > 0) {
+        charts += spare * 0.6;
+        events += spare * 0.4;
+    }
+    setContentHeight(std::max(needed, bounds().height));
+    double y = 0;
+    const auto place = [&](View& view, double height, double side = 0) {
+        view.setFrame({side, y, std::max(width - 2 * side, 0.0), height});
+        y += height;
+    };
+    place(_now, _now.heightForWidth(width));
+    place(_neighboursHeading, heading, margin);
+    place(_neighbours, _neighbours.heightOfRows(neighbourRowsShown));
+    y += gap;
+    place(_chartsHeading, heading, margin);
+    place(_charts, charts);
+    y += gap;
+    place(_eventsHeading, heading, margin);
+    place(_events, events);
+}
+
+} // namespace velmora

@@ -1,0 +1,49 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include "App/DriveView/DriveCharts.h"
+#include "App/DriveView/EventList.h"
+#include "App/DriveView/NowView.h"
+#include "Toolkit/PageView.h"
+#include "Toolkit/Tables/GridView.h"
+
+#include <string_view>
+
+namespace velmora {
+
+/// What a drive tester looks at, from top to bottom: the serving cell now, the neighbours, the drive over
+/// time, the events. A page that scrolls where it is higher than its room.
+class DriveView final : public PageView {
+public:
+    /// All must outlive it.
+    DriveView(const DriveModel& model, const DriveHistory& history, const Clock& clock);
+    ~DriveView() override;
+
+    /// Shows what is known at that time. `link` says that no messages arrive; empty where they do.
+    void update(Time now, std::string_view link);
+    /// The same of the charts, which cost more and are drawn less often.
+    void updateCharts(Time now);
+    void layoutSubviews() override;
+
+    [[nodiscard]] NowView& nowView() { return _now; }
+    [[nodiscard]] GridView& neighbours() { return _neighbours; }
+    [[nodiscard]] DriveCharts& charts() { return _charts; }
+    [[nodiscard]] EventList& events() { return _events; }
+
+private:
+    const DriveModel& _model;
+    NowView _now;
+    Label _neighboursHeading{"Neighbours"};
+    GridView _neighbours;
+    Label _chartsHeading{"Over time"};
+    DriveCharts _charts;
+    Label _eventsHeading{"Events"};
+    EventList _events;
+    const Clock& _clock;
+    std::optional<RadioTechnology> _columnsOf;
+    std::size_t _panels = 0;
+};
+
+} // namespace velmora

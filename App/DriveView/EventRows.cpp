@@ -1,0 +1,44 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
+#include "App/DriveView/EventRows.h"
+
+#include "App/DriveView/DriveText.h"
+
+#include <string>
+
+namespace velmora {
+
+namespace {
+
+Color colorOf(Severity severity) {
+    switch (severity) {
+    case Severity::Info: return Color::secondary;
+    case Severity::Warning: return Color::fair;
+    case Severity::Critical: break;
+    }
+    return Color::poor;
+}
+
+} // namespace
+
+std::vector<GridColumn> eventColumns() {
+    return {{"Time", "23:59:59"}, {"Severity", "warning"}, {"Event", ""}};
+}
+
+EventRows eventRows(const std::deque<Event>& events, const SeverityFilter& filter, const Clock& clock) {
+    EventRows made;
+    for (const Event& each : events) {
+        if (!filter[static_cast<std::size_t>(each.severity)])
+            continue;
+        const std::string text = each.text.empty() ? each.kind : each.text;
+        const std::string lasting = each.lasts && !each.end ? " (lasts)" : "";
+        made.rows.push_back({{clockText(each.time, clock), {}, Color::automatic, {}},
+                             {std::string(nameOf(each.severity)), {}, colorOf(each.severity), {}},
+                             {text + lasting, {}, Color::automatic, each.kind + ", " + text + lasting}});
+        made.times.push_back(each.time);
+    }
+    return made;
+}
+
+} // namespace velmora
