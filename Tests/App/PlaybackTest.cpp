@@ -255,9 +255,10 @@ TEST_F(PlaybackScreenTest, ADroppedFileIsShownUntilItIsClosed) {
     EXPECT_EQ(shownBand(), "still live");
 }
 
-TEST_F(PlaybackScreenTest, FitsAPhoneAndADesktop) {
+TEST_F(PlaybackScreenTest, FitsAPhoneAndAWideWindow) {
     openPaused(write("a.pcapng", fiveBands()));
-    for (const int width : {360, 1280}) {
+    // Below 720 points the drive view does not stand beside the panes.
+    for (const int width : {360, 700}) {
         window()->resize(width, 640);
         runUntilIdle();
         const QWidget* const bar = part("velmora.playback");
