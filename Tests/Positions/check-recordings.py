@@ -25,7 +25,7 @@ LOG, DRIVE = BUILD / "velmora-log", BUILD / "tests" / "make-drive"
 def fixes_of(recording: Path) -> int:
     (technologies,) = [json.loads(run(LOG, "info", "--format", "json", recording))]
     positions = technologies.get("positions")
-    return positions["fixes"] if positions else 0
+    return int(positions["fixes"]) if positions else 0
 
 
 def check_road(recording: Path, scenario: str) -> None:
