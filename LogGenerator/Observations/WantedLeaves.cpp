@@ -24,6 +24,8 @@ bool WantedLeaves::ask(const CatalogueField& leaf) const {
 }
 
 bool WantedLeaves::hasAnyAt(const CatalogueNode& node) const {
+    if (!node.leaf() && node.children().empty())
+        return true; // a list whose rows have no fields: how many there are is all that it reports
     return node.isOpen() || (node.leaf() && has(*node.leaf())) ||
            std::any_of(node.children().begin(), node.children().end(),
                        [this](const auto& child) { return hasAnyAt(*child); });

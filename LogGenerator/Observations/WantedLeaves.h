@@ -24,7 +24,8 @@ public:
             return _known[leaf.index] == Known::Wanted;
         return ask(leaf);
     }
-    /// Whether any leaf at the node or below it is observed, also one that messages may name later.
+    /// Whether any leaf at the node or below it is observed, also one that messages may name later. A list
+    /// whose rows have no fields is observed too.
     [[nodiscard]] bool hasAnyAt(const CatalogueNode& node) const;
     [[nodiscard]] bool hasRowKeys() const { return _hasRowKeys; }
 
