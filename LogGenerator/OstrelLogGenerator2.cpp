@@ -153,6 +153,13 @@ Value OstrelLogGenerator2::getDisplayFromState(Dictionary& state) {
 void OstrelLogGenerator2::attachSections(const Value& display, const Value& shape) {
     // The state outlives decoders. After a reconnection this decoder's sections have no nodes yet while the
     // display of the earlier one is still shown: they continue in it, and nothing that it shows is lost.
+    const Array* const elements = display.asArray();
+    const Array* const shapes = shape.asArray();
+    if (elements && shapes) {
+        for (std::size_t i = 0; i < std::min(elements->size(), shapes->size()); ++i)
+            attachSections((*elements)[i], (*shapes)[i]);
+        return;
+    }
     const Dictionary* const nodes = display.asDictionary();
     const Dictionary* const wanted = shape.asDictionary();
     if (!nodes || !wanted)

@@ -102,10 +102,14 @@ TEST_F(OstrelLogGenerator2Test, NewDecoderContinuesWithTheDisplay) {
 }
 
 TEST_F(OstrelLogGenerator2Test, NewDecoderFindsItsNodesWithinAnArrayToo) {
+    const auto withNode = [](const DictionaryRef& node) {
+        return std::make_shared<Dictionary>(Dictionary{
+            {"Radios",
+             std::make_shared<Array>(Array{std::make_shared<Dictionary>(Dictionary{{"RRC Info", node}})})}});
+    };
     const DictionaryRef node = makeDictionary();
-    state.set("Display", std::make_shared<Dictionary>(
-                             Dictionary{{"Radios", std::make_shared<Array>(Array{std::make_shared<Dictionary>(
-                                                       Dictionary{{"RRC Info", node}})})}}));
+    state.set("Template", withNode(makeDictionary()));
+    state.set("Display", withNode(node));
     update(record(0xD0E0, "01 02"));
     static_cast<void>(display());
     EXPECT_EQ((*node)["Length"], Value("15")); // a header of 13 bytes and 2
