@@ -93,6 +93,10 @@ class Walk:
     def see(self, role, start=""):
         return self.wait(f"{role} {start!r}", lambda: self.find(role, start))
 
+    def see_pane(self, name):
+        """Waits for the pane of that very name: the names of others may begin so."""
+        self.wait(f"the pane {name!r}", lambda: any((its, shown) == ("heading", name) for _, its, shown in self.objects()))
+
     def press(self, role, name):
         assert self.see(role, name).do_action(0), f"{role} {name!r} cannot be pressed"
 
@@ -193,10 +197,10 @@ class Walk:
             if not item:  # the drive has moved on
                 continue
             assert item[0].do_action(0), f"{row!r} cannot be pressed"
-            self.see("heading", row)
+            self.see_pane(row)
             seen += self.walk_panes(row, depth + 1)
             self.press("push button", "Back")
-            self.see("heading", name)
+            self.see_pane(name)
         return seen
 
     def check_save_screen(self):

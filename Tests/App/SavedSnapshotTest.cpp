@@ -104,9 +104,12 @@ TEST_F(SavedSnapshotTest, HeadingIsReadInFullAtAnyWidth) {
     for (const int width : {240, 360, 800}) {
         window()->resize(width, 640);
         runUntilIdle();
-        const auto found = shownWidgets("Save Snapshot");
-        ASSERT_FALSE(found.empty());
-        const auto& heading = dynamic_cast<const LabelWidget&>(*found.back());
+        const LabelWidget* shown = nullptr; // the dialog has the same name
+        for (const QWidget* const widget : shownWidgets("Save Snapshot"))
+            if (const auto* const label = dynamic_cast<const LabelWidget*>(widget))
+                shown = label;
+        ASSERT_TRUE(shown);
+        const LabelWidget& heading = *shown;
         EXPECT_EQ(heading.shownText(), "Save Snapshot") << width;
         const QRect place(heading.mapTo(window(), QPoint()), heading.size());
         EXPECT_TRUE(window()->rect().contains(place)) << width;
