@@ -10,15 +10,20 @@
 
 namespace velmora {
 
-using namespace std::chrono_literals;
+namespace {
+
+constexpr std::chrono::seconds minute{60};
+constexpr std::chrono::seconds hour{3600};
+
+} // namespace
 
 std::string ageText(Time then, Time now) {
     const auto age = std::chrono::floor<std::chrono::seconds>(std::max(now - then, Time::duration::zero()));
-    if (age < 60s)
+    if (age < minute)
         return std::to_string(age.count()) + " s ago";
-    if (age < 3600s)
-        return std::to_string(age.count() / 60) + " min ago";
-    return std::to_string(age.count() / 3600) + " h ago";
+    if (age < hour)
+        return std::to_string(age / minute) + " min ago";
+    return std::to_string(age / hour) + " h ago";
 }
 
 bool isOld(Time then, Time now) {

@@ -122,7 +122,8 @@ TEST(PositionedReader, doesNotWaitWithoutPositions) {
 
 TEST(PositionedReader, readsNoFurtherThanAPositionNeeds) {
     std::vector<ScriptedReader::Entry> entries = {fix(0ms, 0)};
-    for (std::chrono::milliseconds time = 0ms; time < 100s; time += 10ms)
+    constexpr std::chrono::milliseconds end{100'000};
+    for (std::chrono::milliseconds time{0}; time < end; time += 10ms)
         entries.push_back({time + 5ms, ""});
     ScriptedReader scripted(entries);
     PositionedReader reader(scripted);

@@ -92,12 +92,13 @@ TEST(RoadPositions, areWithinAMetreAt23MetresASecond) {
 }
 
 TEST(RoadPositions, ofEveryDriveAreOnItsRoad) {
+    constexpr std::chrono::seconds end{300};
     for (const ScenarioKind& kind : scenarioKinds()) {
         const std::unique_ptr<Scenario> scenario = kind.make(7);
         RoadReceiver receiver(DriveScenario::startTime());
         std::vector<Fix> fixes;
         std::vector<std::chrono::nanoseconds> messages;
-        while (messages.empty() || messages.back() < 300s) {
+        while (messages.empty() || messages.back() < end) {
             messages.push_back(scenario->next().offset);
             EXPECT_GE(messages.back(), scenario->place().offset) << kind.name;
             for (const Fix& fix : receiver.drivenTo(scenario->place()))
