@@ -213,7 +213,7 @@ void VelmoraApp::togglePrivacy() {
 }
 
 void VelmoraApp::pinFocusRow() {
-    if (_model)
+    if (_model && !_playback) // charts are of what is received
         static_cast<VelmoraPaneController&>(*_navController->topViewController()).togglePinOfFocusRow();
 }
 

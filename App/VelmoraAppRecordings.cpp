@@ -1,6 +1,7 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
+#include "App/DriveView/DriveScreen.h"
 #include "App/MaskingModel.h"
 #include "App/Playback/PlaybackController.h"
 #include "App/Recording/RecordingSwitch.h"
@@ -57,6 +58,7 @@ void VelmoraApp::openRecording(const std::string& path, const std::string& techn
     closeSaveView();
     _navController->setAccessories({});
     _playback = *std::move(opened);
+    _drive->setLive(false);
     clearPanes();
     showBars();
     showMoment();
@@ -69,6 +71,7 @@ void VelmoraApp::closeRecording() {
     closeSaveView();
     _navController->setAccessories({});
     _playback.reset();
+    _drive->setLive(true);
     showBars();
     clearPanes();
     if (std::exchange(_recordingPath, {}).empty())

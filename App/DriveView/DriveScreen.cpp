@@ -36,7 +36,8 @@ DriveScreen::~DriveScreen() {
 
 std::shared_ptr<SplitController>
 DriveScreen::standBeside(const std::shared_ptr<NavigationController>& panes) {
-    panes->setHeaderCommand(buttonTitle, [this] { toggle(); });
+    _panes = panes;
+    setButton();
     _split = std::make_shared<SplitController>(panes, _stack);
     _split->setOnWidthChanged([this] { arrange(); });
     arrange();
@@ -49,15 +50,30 @@ void DriveScreen::arrange() {
         _stack->setLeave({}, {});
     else
         _stack->setLeave("Velmora", [this] { toggle(); });
-    _split->setSecondShown(_split->isWide() ? _isBeside : _isOpen);
+    _split->setSecondShown(_isLive && (_split->isWide() ? _isBeside : _isOpen));
 }
 
 bool DriveScreen::isShown() const {
     return _split && _split->isSecondShown();
 }
 
-void DriveScreen::toggle() {
+void DriveScreen::setButton() {
+    if (_isLive)
+        _panes->setHeaderCommand(buttonTitle, [this] { toggle(); });
+    else
+        _panes->setHeaderCommand({}, {});
+}
+
+void DriveScreen::setLive(bool isLive) {
+    _isLive = isLive;
     if (!_split)
+        return;
+    setButton();
+    arrange();
+}
+
+void DriveScreen::toggle() {
+    if (!_split || !_isLive)
         return;
     if (_split->isWide()) {
         _isBeside = !_isBeside;

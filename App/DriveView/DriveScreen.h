@@ -41,6 +41,9 @@ public:
     void toggle();
     /// Shows it, on a narrow window too.
     void open();
+    /// Whether the panes show what is received, as the view always does; they do at first. Otherwise the view
+    /// and its button are hidden.
+    void setLive(bool isLive);
     /// The connection was lost.
     void linkLost();
     /// Forgets everything, on the screen too.
@@ -49,6 +52,7 @@ public:
 private:
     [[nodiscard]] std::string link() const;
     void arrange();
+    void setButton();
 
     AppPlatform& _platform;
     std::function<bool()> _isConnected;
@@ -56,7 +60,9 @@ private:
     DriveModel _model;
     std::shared_ptr<DriveViewController> _controller;
     std::shared_ptr<NavigationController> _stack;
+    std::shared_ptr<NavigationController> _panes;
     std::shared_ptr<SplitController> _split;
+    bool _isLive = true;
     bool _isOpen = false; ///< on a narrow window
     bool _isBeside;       ///< on a wide one
 };

@@ -3,6 +3,7 @@
 
 #include "Tests/App/PlaybackFixture.h"
 
+#include "App/DriveView/DriveScreen.h"
 #include "Model/Snapshot.h"
 
 #include <QDropEvent>
@@ -255,10 +256,24 @@ TEST_F(PlaybackScreenTest, ADroppedFileIsShownUntilItIsClosed) {
     EXPECT_EQ(shownBand(), "still live");
 }
 
+TEST_F(PlaybackScreenTest, ClosesTheDriveViewWhichShowsWhatIsReceived) {
+    app.setBeginsWithDrive(true);
+    openPaused(write("a.pcapng", fiveBands()));
+    for (const int width : {360, 800}) {
+        window()->resize(width, 640);
+        runUntilIdle();
+        EXPECT_FALSE(app.drive().isShown()) << width;
+        QTest::keyClick(window(), Qt::Key_D, Qt::ControlModifier);
+        EXPECT_FALSE(app.drive().isShown()) << width;
+    }
+    QTest::keyClick(window(), Qt::Key_W, Qt::ControlModifier);
+    runUntilIdle();
+    EXPECT_TRUE(app.drive().isShown());
+}
+
 TEST_F(PlaybackScreenTest, FitsAPhoneAndAWideWindow) {
     openPaused(write("a.pcapng", fiveBands()));
-    // Below 720 points the drive view does not stand beside the panes.
-    for (const int width : {360, 700}) {
+    for (const int width : {360, 800}) {
         window()->resize(width, 640);
         runUntilIdle();
         const QWidget* const bar = part("velmora.playback");
