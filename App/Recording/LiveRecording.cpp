@@ -96,7 +96,7 @@ void LiveRecording::reportMoves() {
     }
 }
 
-/// A failure ends the recording. Its user is told once what has failed is over.
+/// A failure ends the recording. A notice says once that what has failed is over.
 void LiveRecording::check(const Result<Done>& result) {
     reportMoves();
     if (result || std::exchange(_hasEnded, true))

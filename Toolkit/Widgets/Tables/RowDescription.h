@@ -16,7 +16,7 @@ class TableWidget;
 
 /// The cell's name and accessory, or what the data source says of a row without a cell.
 [[nodiscard]] TableRowSummary rowSummary(const TableWidget& table, std::size_t row);
-/// What screen readers are told of a row besides its name, whether or not it is on the screen.
+/// What screen readers get of a row besides its name, whether or not it is on the screen.
 [[nodiscard]] QAccessible::State rowState(const TableWidget& table, std::size_t row,
                                           TableCellAccessory accessory);
 /// "Opens a list" for a row that does; else empty.
