@@ -106,6 +106,8 @@ function(velmora_test name)
     velmora_compile_quickly(${name})
     if(VELMORA_PRECOMPILED_HEADERS)
         target_precompile_headers(${name} REUSE_FROM test-headers)
+        # As the headers were compiled, and as the tests that use Qt are.
+        target_compile_options(${name} PRIVATE -fPIC)
     endif()
     if(arg_NEEDS)
         add_dependencies(${name} ${arg_NEEDS})
