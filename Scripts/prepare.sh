@@ -109,6 +109,10 @@ configure() {
     [ -f "$directory/build.ninja" ] && [ $# -eq 0 ] && return 0
     say "Configuring $directory"
     mkdir -p "$directory"
+    # Where ccache compiles, precompiled headers would cost more than they spare.
+    if [[ $preset =~ ^(release|fuzz)$ ]] && [ -z "${CMAKE_CXX_COMPILER_LAUNCHER-}" ]; then
+        set -- -DVELMORA_PRECOMPILED_HEADERS=ON "$@"
+    fi
     cmake --preset "$preset" "$@" >"$directory/configure.log" 2>&1 || {
         cat "$directory/configure.log" >&2
         return 1
