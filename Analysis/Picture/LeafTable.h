@@ -19,12 +19,18 @@ public:
     /// `make` turns a leaf into the value. Valid until the next call.
     template <class Make>
     [[nodiscard]] const Value& at(const CatalogueField& leaf, Make make) {
-        while (leaf.index >= _values.size())
-            _values.push_back(make(_catalogue.fields()[_values.size()]));
+        if (leaf.index >= _values.size()) [[unlikely]]
+            fill(leaf.index, make);
         return _values[leaf.index];
     }
 
 private:
+    template <class Make>
+    void fill(std::size_t index, Make make) {
+        while (index >= _values.size())
+            _values.push_back(make(_catalogue.fields()[_values.size()]));
+    }
+
     const Catalogue& _catalogue;
     std::vector<Value> _values; ///< by index
 };

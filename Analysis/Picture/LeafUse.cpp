@@ -45,8 +45,9 @@ LeafUse useOf(const CatalogueField& leaf, const TechnologyTable& table) {
     }
     use.modes = rowOf(table.modes, leaf.path);
     use.evidence = rowOf(table.evidence, leaf.path);
-    use.isUsed = use.role != Role::None || use.namesTechnology || use.part != NeighbourPart::None ||
-                 use.modes || use.evidence;
+    use.isOfNeighbour = use.part != NeighbourPart::None || isNeighbour(use.role);
+    use.isOfSide = (use.role != Role::None && !isNeighbour(use.role)) || use.modes || use.evidence;
+    use.isUsed = use.isOfNeighbour || use.isOfSide || use.namesTechnology;
     return use;
 }
 

@@ -32,7 +32,9 @@ inline constexpr std::size_t radioSides = radioTechnologies + 1;
 
 /// What the picture makes of a leaf.
 struct LeafUse {
-    bool isUsed = false;    ///< at all
+    bool isUsed = false; ///< at all
+    bool isOfNeighbour = false;
+    bool isOfSide = false;  ///< it reports something of a serving cell or of the mode
     Role role = Role::None; ///< none for one that is ignored
     RadioSide side = commonSide;
     bool namesTechnology = false; ///< of the serving cell

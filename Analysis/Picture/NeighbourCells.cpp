@@ -15,7 +15,12 @@ namespace {
 
 constexpr double noLevel = -std::numeric_limits<double>::infinity();
 
-/// Both have a channel and a physical cell.
+/// Whether it can be compared with others.
+bool hasIdentity(const Neighbour& cell) {
+    return cell.channel && cell.physicalCell;
+}
+
+/// Precondition: both have an identity.
 bool areSame(const Neighbour& one, const Neighbour& other) {
     return *one.channel == *other.channel && *one.physicalCell == *other.physicalCell &&
            one.technology == other.technology;
@@ -77,51 +82,61 @@ bool NeighbourCells::isReplaced(const Neighbour& cell, const CatalogueNode* list
     return !_channel || !cell.channel || isOnChannel;
 }
 
-void NeighbourCells::beginSeen(std::size_t cells) {
-    _seen.assign(std::bit_ceil(2 * cells + 1), 0);
-}
-
-bool NeighbourCells::wasSeen(std::uint32_t order) {
-    const Neighbour& cell = at(order);
-    if (!cell.channel || !cell.physicalCell)
-        return false;
+std::uint32_t& NeighbourCells::slotOf(const Neighbour& cell) {
     const std::size_t mask = _seen.size() - 1;
     std::size_t slot = hashOf(cell) & mask;
-    for (; _seen[slot] != 0; slot = (slot + 1) & mask)
-        if (areSame(at(_seen[slot] - 1), cell))
-            return true;
-    _seen[slot] = order + 1;
-    return false;
+    while (_seen[slot] != 0 && !areSame(at(_seen[slot] - 1), cell))
+        slot = (slot + 1) & mask;
+    return _seen[slot];
 }
 
-/// A cell that several lists have, or one list has twice, is one neighbour: that of the latest report.
-void NeighbourCells::rank(Time now) {
-    _ranks.clear();
-    const std::size_t kept = _cells.size();
-    const auto all = static_cast<std::uint32_t>(kept + _new.size());
-    beginSeen(all);
-    for (std::uint32_t order = all; order-- > 0;) {
-        const Neighbour& cell = at(order);
-        const bool isOut = order < kept ? isReplaced(cell, _lists[order], now) : _new[order - kept].isServing;
-        if (!isOut && !wasSeen(order))
-            _ranks.push_back({cell.level_dBm.value_or(noLevel), order});
+bool NeighbourCells::mayReplace() const {
+    return !_replaced.empty() &&
+           (_channel || std::any_of(_lists.begin(), _lists.end(), [this](const auto* list) {
+                return std::find(_replaced.begin(), _replaced.end(), list) != _replaced.end();
+            }));
+}
+
+/// One that the message has twice is one neighbour: the later one.
+void NeighbourCells::rankNew() {
+    _newRanks.clear();
+    _seen.assign(std::bit_ceil(2 * _new.size() + 1), 0);
+    const auto kept = static_cast<std::uint32_t>(_cells.size());
+    for (auto order = static_cast<std::uint32_t>(kept + _new.size()); order-- > kept;) {
+        const NewCell& cell = _new[order - kept];
+        if (cell.isServing)
+            continue;
+        if (hasIdentity(cell.neighbour)) {
+            std::uint32_t& slot = slotOf(cell.neighbour);
+            if (slot != 0)
+                continue;
+            slot = order + 1;
+        }
+        _newRanks.push_back({cell.neighbour.level_dBm.value_or(noLevel), order});
     }
-    std::sort(_ranks.begin(), _ranks.end(), [](const Rank& one, const Rank& other) {
-        return one.level != other.level ? one.level > other.level : one.order < other.order;
-    });
+    std::sort(_newRanks.begin(), _newRanks.end());
+}
+
+/// The kept cells are in their order already. One that the message has too is that of the message.
+void NeighbourCells::rank(Time now) {
+    rankNew();
+    _ranks.clear();
+    auto next = _newRanks.begin();
+    for (std::uint32_t order = 0; order < _cells.size(); ++order) {
+        const Neighbour& cell = _cells[order];
+        if (isReplaced(cell, _lists[order], now) || (hasIdentity(cell) && slotOf(cell) != 0))
+            continue;
+        const Rank rank{cell.level_dBm.value_or(noLevel), order};
+        for (; next != _newRanks.end() && *next < rank; ++next)
+            _ranks.push_back(*next);
+        _ranks.push_back(rank);
+    }
+    _ranks.insert(_ranks.end(), next, _newRanks.end());
     if (_ranks.size() > most)
         _ranks.resize(most);
 }
 
-bool NeighbourCells::endMessage(Time now) {
-    const bool hasOld = !_cells.empty() && now - _oldest > lifetime;
-    if (_replaced.empty() && _new.empty() && !hasOld)
-        return false;
-    for (NewCell& cell : _new)
-        if (!cell.neighbour.channel)
-            cell.neighbour.channel = _channel;
-    rank(now);
-    _replaced.clear();
+void NeighbourCells::arrange() {
     _nextCells.clear();
     _nextLists.clear();
     _oldest = Time::max();
@@ -132,6 +147,20 @@ bool NeighbourCells::endMessage(Time now) {
     }
     _cells.swap(_nextCells);
     _lists.swap(_nextLists);
+}
+
+bool NeighbourCells::endMessage(Time now) {
+    const bool hasOld = !_cells.empty() && now - _oldest > lifetime;
+    if (_replaced.empty() && _new.empty() && !hasOld)
+        return false;
+    for (NewCell& cell : _new)
+        if (!cell.neighbour.channel)
+            cell.neighbour.channel = _channel;
+    if (!_new.empty() || hasOld || mayReplace()) {
+        rank(now);
+        arrange();
+    }
+    _replaced.clear();
     return true;
 }
 

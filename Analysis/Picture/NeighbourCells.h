@@ -52,6 +52,10 @@ private:
     struct Rank {
         double level;        ///< that of a cell without one is below all others
         std::uint32_t order; ///< of the report: the kept cells, then the new ones
+
+        friend bool operator<(const Rank& one, const Rank& other) {
+            return one.level != other.level ? one.level > other.level : one.order < other.order;
+        }
     };
 
     [[nodiscard]] bool isReplaced(const Neighbour& cell, const CatalogueNode* list, Time now) const;
@@ -62,11 +66,15 @@ private:
     [[nodiscard]] const CatalogueNode* listOf(std::uint32_t order) const {
         return order < _lists.size() ? _lists[order] : _new[order - _lists.size()].list;
     }
+    /// Whether the message may have replaced a kept cell, with or without new ones.
+    [[nodiscard]] bool mayReplace() const;
     /// Ranks the cells that stay and the new ones.
     void rank(Time now);
-    /// Whether a cell of the same identity has been seen since `beginSeen`; it has from now on.
-    [[nodiscard]] bool wasSeen(std::uint32_t order);
-    void beginSeen(std::size_t cells);
+    void rankNew();
+    /// The slot of a cell of the same identity, or the free one for it. Precondition: the cell has one.
+    [[nodiscard]] std::uint32_t& slotOf(const Neighbour& cell);
+    /// Puts the cells in the order of their ranks.
+    void arrange();
 
     std::vector<Neighbour> _cells;               ///< in the order of their levels
     std::vector<const CatalogueNode*> _lists;    ///< that each of them is of
@@ -78,7 +86,8 @@ private:
 
     // Storage that is used again:
     std::vector<Rank> _ranks;
-    std::vector<std::uint32_t> _seen; ///< a hash table of cells by their order, plus 1
+    std::vector<Rank> _newRanks;
+    std::vector<std::uint32_t> _seen; ///< a hash table of new cells by their order, plus 1
     std::vector<Neighbour> _nextCells;
     std::vector<const CatalogueNode*> _nextLists;
 };

@@ -26,8 +26,16 @@ const LeafUse& RadioPicture::useOf(const CatalogueField& leaf) {
         const LeafUse use = velmora::useOf(each, _table);
         if (use.list && isServing(use.role))
             _servingLists.push_back({use.list, use.side, use.role});
+        if (use.isOfSide)
+            addReported(use.side);
         return use;
     });
+}
+
+void RadioPicture::addReported(RadioSide side) {
+    const auto place = std::lower_bound(_reported.begin(), _reported.end(), side);
+    if (place == _reported.end() || *place != side)
+        _reported.insert(place, side);
 }
 
 void RadioPicture::update(const MessageReport& report) {
@@ -46,16 +54,21 @@ void RadioPicture::update(const MessageReport& report) {
 }
 
 void RadioPicture::gather(const MessageReport& report) {
-    for (RadioSideState& each : _sides)
-        each.beginMessage();
+    for (const RadioSide each : _reported)
+        _sides[each].beginMessage();
     _named.reset();
     _neighbours.beginMessage();
+    _toKeep.clear();
     for (const Observation& each : report.observed.observations) {
         const LeafUse& use = useOf(*each.leaf);
         if (!use.isUsed)
             continue;
-        if (use.part != NeighbourPart::None || isNeighbour(use.role))
+        if (use.isOfNeighbour)
             _neighbours.add(each, use, report, _table);
+        if (use.role != Role::None && !isNeighbour(use.role))
+            _toKeep.push_back(&each);
+        else if (!use.isOfSide && !use.namesTechnology)
+            continue;
         if ((use.modes || use.evidence) && _sides[use.side].takeMode(each, use, report.time))
             forgetCells(use.side);
         if (each.kind == ObservedKind::Absent)
@@ -80,7 +93,7 @@ void RadioPicture::forgetCells(RadioSide side) {
 }
 
 void RadioPicture::forgetOld(Time now) {
-    for (RadioSide i = 0; i < radioSides; ++i) {
+    for (const RadioSide i : _reported) {
         RadioSideState& side = _sides[i];
         if (side.isReported && now - side.reported > servingLifetime)
             forgetCell(i);
@@ -110,7 +123,7 @@ CellIdentity RadioPicture::identity(RadioSide side) const {
 }
 
 void RadioPicture::change(const MessageReport& report) {
-    for (RadioSide i = 0; i < radioSides; ++i) {
+    for (const RadioSide i : _reported) {
         RadioSideState& side = _sides[i];
         if (!side.found.isKnown() || !side.reportsCell(_table))
             continue;
@@ -149,18 +162,19 @@ void RadioPicture::change(const MessageReport& report) {
         }
         side.isReported = true;
     }
-    for (RadioSideState& each : _sides)
+    for (const RadioSide i : _reported) {
+        RadioSideState& each = _sides[i];
         if (each.isServing && each.isReported && each.reportsCell(_table)) {
             each.reported = report.time;
             each.message = report.message;
         }
+    }
 }
 
 void RadioPicture::keep(const MessageReport& report) {
-    for (const Observation& each : report.observed.observations) {
+    for (const Observation* const kept : _toKeep) {
+        const Observation& each = *kept;
         const LeafUse& use = useOf(*each.leaf);
-        if (use.role == Role::None || isNeighbour(use.role))
-            continue;
         RadioSideState& side = _sides[use.side];
         const std::uint32_t row = each.rows.empty() ? 0 : each.rows.back();
         if (each.kind == ObservedKind::Absent || isZeroForNone(each, use, _table))
@@ -183,7 +197,7 @@ void RadioPicture::forgetReplaced(const MessageReport& report) {
 }
 
 void RadioPicture::findCurrent() {
-    for (RadioSide i = 0; i < radioSides; ++i)
+    for (const RadioSide i : _reported)
         if (_sides[i].isReported && !identity(i).isKnown())
             forgetCell(i); // it was withdrawn
     if (_table.isHybrid) {

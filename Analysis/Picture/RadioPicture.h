@@ -62,6 +62,7 @@ public:
 
 private:
     const LeafUse& useOf(const CatalogueField& leaf);
+    void addReported(RadioSide side);
     /// Notes what the message says of serving cells and neighbours, before any of it is kept.
     void gather(const MessageReport& report);
     void forgetOld(Time now);
@@ -83,12 +84,15 @@ private:
     const TechnologyTable& _table;
     LeafTable<LeafUse> _uses;
     std::array<RadioSideState, radioSides> _sides;
+    std::vector<RadioSide>
+        _reported; ///< those that leaves report anything of, in order; of others nothing is known
     NeighbourCells _neighbours;
     RoleReadings _strongest; ///< the strongest neighbour's
     std::optional<RadioTechnology> _technology;
     std::optional<RadioTechnology> _named; ///< the radio technology that the message names
     RadioSide _current = commonSide;       ///< of the serving cell
     std::optional<ServingChange> _change;
+    std::vector<const Observation*> _toKeep; ///< of the message: values of roles but neighbours'
     ObservedText _text;
     /// The lists of serving cells, as far as they have been seen.
     struct ServingList {

@@ -6,6 +6,8 @@
 #include "Analysis/Rules/Evaluation/Evaluator.h"
 #include "Analysis/Rules/Evaluation/NumberOperations.h"
 
+#include <algorithm>
+
 namespace velmora {
 
 namespace {
@@ -50,11 +52,30 @@ ColumnEvaluator::ColumnEvaluator(const Expression& expression)
     }
 }
 
-std::span<const double> ColumnEvaluator::evaluate(const ExpressionNode& node,
+ColumnEvaluator::Column ColumnEvaluator::evaluate(const ExpressionNode& node,
                                                   const NeighbourColumns& neighbours, Evaluator& scalars) {
     _neighbours = &neighbours;
     _scalars = &scalars;
-    return {column(node.first).values, neighbours.size()};
+    return column(node.first);
+}
+
+/// Whether the first operand of `and` or `or` decides for all neighbours, which is mostly so: the second one
+/// need not be evaluated then.
+bool ColumnEvaluator::isDecided(bool decisive, const Column& first) const {
+    return std::all_of(first.values, first.values + count(first), [decisive](double value) {
+        return decisive ? isKnownNumber(value) && value != 0 : value == 0;
+    });
+}
+
+template <class Function>
+ColumnEvaluator::Column ColumnEvaluator::combine(std::vector<double>& values, const Column& first,
+                                                 const Column& second, Function function) const {
+    const std::size_t rows = _neighbours->size();
+    const double* one = first.values;
+    const double* other = second.values;
+    for (std::size_t i = 0; i < rows; ++i, one += first.step, other += second.step)
+        values[i] = function(*one, *other);
+    return {values.data(), 1};
 }
 
 ColumnEvaluator::Column ColumnEvaluator::column(std::uint32_t index) {
@@ -66,29 +87,27 @@ ColumnEvaluator::Column ColumnEvaluator::column(std::uint32_t index) {
     }
     if (node.operation == Operation::Input)
         return {_neighbours->of(_expression->inputs[node.input].role).data(), 1};
-    const std::size_t count = _neighbours->size();
-    values.resize(count);
+    values.resize(std::max(values.size(), _neighbours->size()));
     if (node.operation == Operation::Known) {
-        const std::span<const double> known = _neighbours->of(_expression->inputs[node.input].role);
-        for (std::size_t i = 0; i < count; ++i)
-            values[i] = truthNumber(isKnownNumber(known[i]));
-        return {values.data(), 1};
+        const Column known{_neighbours->of(_expression->inputs[node.input].role).data(), 1};
+        return combine(values, known, known,
+                       [](double value, double) { return truthNumber(isKnownNumber(value)); });
     }
     const Column first = column(node.first);
-    if (isUnary(node.operation)) {
-        for (std::size_t i = 0; i < count; ++i)
-            values[i] = unary(node.operation, first.values[i * first.step]);
-        return {values.data(), 1};
-    }
-    const Column second = column(node.second);
-    const auto combine = [&](auto function) {
-        for (std::size_t i = 0; i < count; ++i)
-            values[i] = function(first.values[i * first.step], second.values[i * second.step]);
-    };
-    if (!withBinaryOperation(node.operation, combine))
-        combine([decisive = node.operation == Operation::Or](double one, double other) {
-            return connection(decisive, one, other);
+    if (isUnary(node.operation))
+        return combine(values, first, first, [operation = node.operation](double value, double) {
+            return unary(operation, value);
         });
+    const bool isOr = node.operation == Operation::Or;
+    const bool isConnection = isOr || node.operation == Operation::And;
+    if (isConnection && isDecided(isOr, first))
+        return first;
+    const Column second = column(node.second);
+    if (isConnection)
+        return combine(values, first, second,
+                       [isOr](double one, double other) { return connection(isOr, one, other); });
+    withBinaryOperation(node.operation,
+                        [&](auto function) { static_cast<void>(combine(values, first, second, function)); });
     return {values.data(), 1};
 }
 

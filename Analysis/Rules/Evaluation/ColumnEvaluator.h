@@ -8,7 +8,6 @@
 
 #include <cstddef>
 #include <cstdint>
-#include <span>
 #include <vector>
 
 namespace velmora {
@@ -26,19 +25,27 @@ public:
     [[nodiscard]] bool canEvaluate(const ExpressionNode& node) const {
         return _isSupported[node.first] && _isOfNeighbours[node.first];
     }
-    /// The operand's value for each neighbour, in their order, NaN where it is unknown. `scalars` evaluates
-    /// what is the same for all. Valid until the next call. Precondition: `canEvaluate`.
-    [[nodiscard]] std::span<const double> evaluate(const ExpressionNode& node,
-                                                   const NeighbourColumns& neighbours, Evaluator& scalars);
-
-private:
-    /// The values of a node; one for all neighbours where `step` is 0.
+    /// The values of a node for each neighbour, in their order, NaN where it is unknown; one for all where
+    /// `step` is 0, else `step` is 1.
     struct Column {
         const double* values;
         std::size_t step;
     };
+    /// The operand's. `scalars` evaluates what is the same for all. Valid until the next call. Precondition:
+    /// `canEvaluate`.
+    [[nodiscard]] Column evaluate(const ExpressionNode& node, const NeighbourColumns& neighbours,
+                                  Evaluator& scalars);
 
+private:
     [[nodiscard]] Column column(std::uint32_t node);
+    [[nodiscard]] std::size_t count(const Column& column) const {
+        return column.step == 0 ? 1 : _neighbours->size();
+    }
+    [[nodiscard]] bool isDecided(bool decisive, const Column& first) const;
+    /// `function` of what all neighbours have in the first column, and in the second.
+    template <class Function>
+    [[nodiscard]] Column combine(std::vector<double>& values, const Column& first, const Column& second,
+                                 Function function) const;
 
     const Expression* _expression;
     // By node:

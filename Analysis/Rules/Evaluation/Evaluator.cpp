@@ -181,13 +181,18 @@ bool Evaluator::forEach(const ExpressionNode& node, Each each) {
     bool hasAny = false;
     if (_expression.inputs[input].kind == RuleInput::Kind::EachNeighbour) {
         if (_columns.canEvaluate(node)) {
-            const std::span<const double> values = _columns.evaluate(node, _inputs.neighbourColumns(), *this);
-            std::for_each(values.begin(), values.end(), each);
-            return !values.empty();
+            const ColumnEvaluator::Column column = _columns.evaluate(node, _inputs.neighbourColumns(), *this);
+            const std::size_t count = _inputs.neighbourColumns().size();
+            if (column.step == 0 && count != 0)
+                each(*column.values, count);
+            else
+                std::for_each(column.values, column.values + count,
+                              [&each](double value) { each(value, 1); });
+            return count != 0;
         }
         for (const Neighbour& neighbour : _inputs.neighbours()) {
             _neighbour = &neighbour;
-            each(number(node.first));
+            each(number(node.first), 1);
             hasAny = true;
         }
         _neighbour = nullptr;
@@ -195,7 +200,7 @@ bool Evaluator::forEach(const ExpressionNode& node, Each each) {
     }
     for (const InputCell& row : _inputs.slot(_slots[input]).cells) {
         _row = &row;
-        each(number(node.first));
+        each(number(node.first), 1);
         hasAny = true;
     }
     _row = nullptr;
@@ -203,23 +208,25 @@ bool Evaluator::forEach(const ExpressionNode& node, Each each) {
 }
 
 double Evaluator::goThrough(const ExpressionNode& node) {
-    double count = 0;
+    std::size_t trueOnes = 0;
     bool hasUnknown = false;
     bool hasFalse = false;
     double most = unknownNumber;
     const bool isLeast = node.operation == Operation::Minimum;
-    const bool hasAny = forEach(node, [&](double value) {
+    const bool isMost = isLeast || node.operation == Operation::Maximum;
+    const bool hasAny = forEach(node, [&](double value, std::size_t times) {
         if (!isKnownNumber(value)) {
             hasUnknown = true;
             return;
         }
         hasFalse = hasFalse || value == 0;
-        count += value != 0 ? 1 : 0;
-        if (!isKnownNumber(most) || (isLeast ? value < most : value > most))
+        trueOnes += value != 0 ? times : 0;
+        if (isMost && (!isKnownNumber(most) || (isLeast ? value < most : value > most)))
             most = value;
     });
     if (!hasAny)
         return unknownNumber;
+    const auto count = static_cast<double>(trueOnes);
     switch (node.operation) {
     case Operation::CountEach: return count;
     case Operation::Any: return count > 0 || !hasUnknown ? truthNumber(count > 0) : unknownNumber;

@@ -38,7 +38,8 @@ private:
     [[nodiscard]] double compute(const ExpressionNode& node);
     [[nodiscard]] double age(const ExpressionNode& node) const;
     [[nodiscard]] double goThrough(const ExpressionNode& node);
-    /// Calls `each` for every neighbour or row. False where there is none.
+    /// Calls `each(value, times)` for the operand's value for every neighbour or row, once for several that
+    /// have the same. False where there is none.
     template <class Each>
     bool forEach(const ExpressionNode& node, Each each);
     /// Null where the input has none in the current row.

@@ -9,24 +9,35 @@
 
 namespace velmora {
 
+namespace {
+
+double numberOf(const std::optional<double>& value) {
+    return value ? finiteNumber(*value) : unknownNumber;
+}
+
+} // namespace
+
 void NeighbourColumns::set(std::span<const Neighbour> neighbours) {
     _size = neighbours.size();
-    for (std::size_t i = 0; i < roles.size(); ++i) {
-        _columns[i].resize(_size);
-        std::transform(neighbours.begin(), neighbours.end(), _columns[i].begin(),
-                       [role = roles[i]](const Neighbour& each) { return valueOf(each, role); });
+    for (std::vector<double>& each : _columns)
+        each.resize(_size);
+    auto& [channels, physicalCells, levels, qualities, detected] = _columns;
+    for (std::size_t i = 0; i < _size; ++i) {
+        const Neighbour& each = neighbours[i];
+        channels[i] = numberOf(each.channel);
+        physicalCells[i] = numberOf(each.physicalCell);
+        levels[i] = numberOf(each.level_dBm);
+        qualities[i] = numberOf(each.quality_dB);
+        detected[i] = truthNumber(each.isDetected);
     }
 }
 
 double NeighbourColumns::valueOf(const Neighbour& neighbour, Role role) {
-    const auto number = [](const std::optional<double>& value) {
-        return finiteNumber(value.value_or(unknownNumber));
-    };
     switch (role) {
-    case Role::NeighbourChannel: return number(neighbour.channel);
-    case Role::NeighbourPhysicalCell: return number(neighbour.physicalCell);
-    case Role::NeighbourLevel: return number(neighbour.level_dBm);
-    case Role::NeighbourQuality: return number(neighbour.quality_dB);
+    case Role::NeighbourChannel: return numberOf(neighbour.channel);
+    case Role::NeighbourPhysicalCell: return numberOf(neighbour.physicalCell);
+    case Role::NeighbourLevel: return numberOf(neighbour.level_dBm);
+    case Role::NeighbourQuality: return numberOf(neighbour.quality_dB);
     default: return truthNumber(neighbour.isDetected);
     }
 }
