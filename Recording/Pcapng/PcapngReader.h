@@ -87,8 +87,8 @@ public:
     using Block = BlockReader::Block;
     /// Passes on all blocks that hold no message and are not damaged, in the file's order between the
     /// messages: section headers, interface descriptions, blocks that are not known here, packets of other
-    /// link types and technologies. Call it before the first `next`; it gets those that have been read to
-    /// open the file at once.
+    /// link types and technologies. What `setSentences` gives is a sentence of the next of these. Call it
+    /// before the first `next`; it gets those that have been read to open the file at once.
     void setOtherBlocks(std::function<void(const Block&)> otherBlocks);
     /// The block of the message that `next` last returned, with the bytes of all where it has several, until
     /// the next call. Precondition: it returned one.

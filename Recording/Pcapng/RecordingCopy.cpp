@@ -27,7 +27,17 @@ RecordingCopy::RecordingCopy(PcapngReader& reader, std::unique_ptr<OutputFile> f
     reader.setOtherBlocks([this](const PcapngReader::Block& block) { addOther(block); });
 }
 
+void RecordingCopy::setPositionRange(SentencesOfRange::SideOf sideOf) {
+    _range.emplace(std::move(sideOf), [this](SentencesOfRange::Block block) { addBlock(std::move(block)); });
+    _reader.setSentences([this](const PositionSentence& sentence) {
+        _sentenceText = sentence.text;
+        _sentence = {sentence.time, _sentenceText, sentence.number};
+    });
+}
+
 Result<Done> RecordingCopy::addMessage() {
+    if (_range)
+        _range->addMessage();
     addBlock(pcapngCopy::readablePacket(_reader.block()));
     return _failure ? Result<Done>(*_failure) : Done{};
 }
@@ -50,6 +60,8 @@ Result<Done> RecordingCopy::addFix(const Fix& fix) {
 }
 
 Result<Done> RecordingCopy::finish() {
+    if (_range)
+        _range->endSection();
     add({});
     if (!_hasInterface && !_names.technology.empty())
         pcapngBlocks::appendInterface(_buffer, _names.technology);
@@ -59,6 +71,8 @@ Result<Done> RecordingCopy::finish() {
 
 void RecordingCopy::addOther(const PcapngReader::Block& block) {
     if (block.type == pcapng::BlockType::SectionHeader) {
+        if (_range)
+            _range->endSection();
         _hasSection = true;
         _isBigEndian = block.bigEndian;
         _interfaces = 0;
@@ -66,9 +80,16 @@ void RecordingCopy::addOther(const PcapngReader::Block& block) {
         add(pcapngCopy::sectionHeader(block));
     } else if (block.type == pcapng::BlockType::InterfaceDescription) {
         addInterface(block);
+    } else if (_sentence) {
+        addSentence(block);
     } else if (pcapngCopy::mayBeCopied(block)) {
         addBlock({block.bytes.begin(), block.bytes.end()});
     }
+}
+
+void RecordingCopy::addSentence(const PcapngReader::Block& block) {
+    _range->add(*_sentence, {block.bytes.begin(), block.bytes.end()});
+    _sentence.reset();
 }
 
 void RecordingCopy::addInterface(const PcapngReader::Block& block) {

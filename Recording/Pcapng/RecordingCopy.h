@@ -7,6 +7,8 @@
 #include "Platform/Result.h"
 #include "Recording/Files/OutputFile.h"
 #include "Recording/Pcapng/PcapngReader.h"
+#include "Recording/Positions/PositionSentence.h"
+#include "Recording/Positions/SentencesOfRange.h"
 
 #include <cstdint>
 #include <memory>
@@ -34,6 +36,9 @@ public:
     /// after this has been destroyed.
     RecordingCopy(PcapngReader& reader, std::unique_ptr<OutputFile> file, std::string name, Names names);
 
+    /// Copies only positions of that range (see SentencesOfRange), the default being all. Before anything has
+    /// been read.
+    void setPositionRange(SentencesOfRange::SideOf sideOf);
     /// Adds the message that the reader last returned.
     Result<Done> addMessage();
     /// Adds a fix, on an interface of positions that the copy gets. Fails where the recording has positions
@@ -44,6 +49,7 @@ public:
 
 private:
     void addOther(const PcapngReader::Block& block);
+    void addSentence(const PcapngReader::Block& block);
     void addInterface(const PcapngReader::Block& block);
     void addBlock(std::vector<std::uint8_t> block);
     void add(Bytes bytes);
@@ -56,6 +62,10 @@ private:
     std::string _name;
     Names _names;
     std::vector<std::uint8_t> _buffer;
+    std::optional<SentencesOfRange> _range; ///< of the positions that are copied; absent for all
+    /// Its block is the next one.
+    std::optional<PositionSentence> _sentence;
+    std::string _sentenceText;
     std::uint32_t _interfaces = 0;                   ///< of the present section, in the copy
     std::optional<std::uint32_t> _positionInterface; ///< of added fixes; in the present section
     bool _hasPositions = false;                      ///< of the recording itself

@@ -93,6 +93,7 @@ std::optional<Fix> FixAssembler::completeAt(Time now) {
 
 std::optional<Fix> FixAssembler::finish() {
     const Epoch epoch = std::exchange(_epoch, {});
+    _epochs += epoch.isBegun ? 1 : 0;
     return epoch.hasPosition && !epoch.isInvalid ? std::optional(epoch.fix) : std::nullopt;
 }
 

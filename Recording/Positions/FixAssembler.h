@@ -36,6 +36,8 @@ public:
     /// The time of the fix that is being made; absent where no sentence with a position has come yet.
     [[nodiscard]] std::optional<Time> pending() const;
 
+    /// How many times sentences that belong together have ended so far, with or without a fix.
+    [[nodiscard]] std::uint64_t epochs() const { return _epochs; }
     /// Sentences so far, and those among them that were damaged.
     [[nodiscard]] std::uint64_t sentences() const { return _sentences; }
     [[nodiscard]] std::uint64_t damaged() const { return _damaged; }
@@ -62,6 +64,7 @@ private:
     void addPosition(const NMEASentence& sentence, std::size_t at, Time time, bool isBest);
 
     Epoch _epoch;
+    std::uint64_t _epochs = 0;
     std::uint64_t _sentences = 0;
     std::uint64_t _damaged = 0;
 };

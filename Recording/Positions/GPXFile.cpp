@@ -19,6 +19,12 @@ namespace {
 
 constexpr double fullCircle = 360;
 
+/// "line 3: ", where the offset is known.
+std::string atLine(std::string_view content, std::ptrdiff_t offset) {
+    return offset < 0 ? std::string()
+                      : "line " + std::to_string(lineAt(content, static_cast<std::size_t>(offset))) + ": ";
+}
+
 /// The name without the prefix of its namespace.
 std::string_view localName(const pugi::xml_node& node) {
     const std::string_view name = node.name();
@@ -131,13 +137,14 @@ Result<std::vector<Fix>> fixesOfGPX(std::string_view content) {
     const pugi::xml_parse_result parsed =
         document.load_buffer(content.data(), content.size(), pugi::parse_default, pugi::encoding_auto);
     if (!parsed)
-        return Failure{std::string("no GPX: ") + parsed.description() + " at offset " +
-                       std::to_string(parsed.offset)};
+        return Failure{atLine(content, parsed.offset) + "no GPX: " + parsed.description()};
     const pugi::xml_node root = document.document_element();
     if (localName(root) != "gpx")
-        return Failure{"root element is " + std::string(localName(root)) + ", wanted gpx"};
+        return Failure{atLine(content, root.offset_debug()) + "root element is " +
+                       std::string(localName(root)) + ", wanted gpx"};
     std::vector<Fix> fixes;
     std::size_t points = 0;
+    std::ptrdiff_t firstPoint = 0;
     for (const pugi::xml_node& track : root.children()) {
         if (localName(track) != "trk")
             continue;
@@ -145,13 +152,17 @@ Result<std::vector<Fix>> fixesOfGPX(std::string_view content) {
             for (const pugi::xml_node& point : segment.children()) {
                 if (localName(point) != "trkpt")
                     continue;
-                ++points;
+                if (++points == 1)
+                    firstPoint = point.offset_debug();
                 if (const auto fix = fixOf(point))
                     fixes.push_back(*fix);
             }
     }
+    if (fixes.empty() && points == 0)
+        return Failure{"no track points"};
     if (fixes.empty())
-        return Failure{"none of " + std::to_string(points) + " track points has a place and a time"};
+        return Failure{atLine(content, firstPoint) + "none of " + std::to_string(points) +
+                       " track points has a place and a time"};
     return fixes;
 }
 

@@ -90,7 +90,8 @@ Result<std::vector<Fix>> fixesOfNMEA(std::string_view content) {
         return !dates;
     });
     if (sentences == 0)
-        return Failure{"no NMEA sentence and no GPX"};
+        return Failure{"line " + std::to_string(lineAt(content, content.find_first_not_of(" \t\r\n"))) +
+                       ": no NMEA sentence and no GPX"};
     if (!dates)
         return Failure{"no date, wanted RMC or ZDA sentences"};
     FixAssembler assembler;

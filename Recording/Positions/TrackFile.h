@@ -7,6 +7,7 @@
 #include "Platform/Fix.h"
 #include "Platform/Result.h"
 
+#include <cstddef>
 #include <optional>
 #include <string_view>
 #include <vector>
@@ -18,8 +19,12 @@ inline constexpr std::size_t maximumTrackFile = std::size_t{256} << 20;
 
 /// The fixes of a track file, in the order of their times: of a GPX file (1.0 or 1.1) the points of its
 /// tracks that have a time; of NMEA sentences, one a line, those that make fixes, by the dates of RMC or ZDA.
-/// Which one it is, its first character says. Fails where there is no fix with a time.
+/// Which one it is, its first character says. Fails where there is no fix with a time; the reason names the
+/// line where one is to blame.
 [[nodiscard]] Result<std::vector<Fix>> fixesOfTrackFile(std::string_view content);
+
+/// The number of the line that the byte at that offset is in, from 1.
+[[nodiscard]] std::size_t lineAt(std::string_view content, std::size_t offset);
 
 [[nodiscard]] Result<std::vector<Fix>> fixesOfGPX(std::string_view content);
 [[nodiscard]] Result<std::vector<Fix>> fixesOfNMEA(std::string_view content);

@@ -250,7 +250,7 @@ _velmora_log() {
     convert) options+=(--force --from --to --code --technology --description --strict --track --select --role --max-gap) ;;
     info) options+=(--format --technology) ;;
     fields) options+=(--technology --role --format --safe) ;;
-    events) options+=(--format --safe --records --live --clock --technology --mask --key --kind --severity --from --to --rules
+    events) options+=(--format --safe --records --positions --max-gap --live --clock --technology --mask --key --kind --severity --from --to --rules
         --no-rules --exec --exec-timeout --fail-on --duration --count --timeout) ;;
     stats) options+=(--format --safe --histogram --by --select --role --from --to --clock --technology --max-gap) ;;
     diff) options+=(--format --display --select --role --clock --technology) ;;

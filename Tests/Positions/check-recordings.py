@@ -10,11 +10,15 @@ BUILD has velmora-log, velmora.lua and tests/make-drive. Capture tools are editc
 
 from __future__ import annotations
 
+import csv
+import io
 import json
 import math
+import re
 import sys
 import tempfile
 from collections import defaultdict
+from datetime import datetime, timedelta
 from pathlib import Path
 
 from positions import distance_from_road, expect, finish, need, run, samples, sentence
@@ -86,6 +90,50 @@ def check_samples_without(recording: Path, plain: Path, scenario: str) -> None:
     expect(run(LOG, "decode", recording) == run(LOG, "decode", plain), f"{scenario}: displays differ")
 
 
+def check_part(recording: Path, part: Path, *options: str) -> None:
+    """A part has the fixes of its time and one at each side, and its samples lie where they lie in the whole."""
+    run(LOG, "convert", "--force", *options, recording, part)
+    whole, rows = ([{name: row[name] for name in ("time", "path", "value", "latitude", "longitude", "fix_age")}
+                    for row in samples(LOG, each, *ranged)] for each, ranged in ((recording, options), (part, ())))
+    expect(whole == rows and len(rows) > 10 and all(row["latitude"] for row in rows),
+           f"part {options}: {len(rows)} samples, {len(whole)} in the whole")
+    (start, end) = (datetime.fromisoformat(json.loads(run(LOG, "info", "--format", "json", part))["positions"][name]
+                                           .replace("Z", "+00:00")) for name in ("first", "last"))
+    times = [datetime.fromisoformat(row["time"].replace("Z", "+00:00")[:26] + "+00:00") for row in rows]
+    second = timedelta(seconds=1)
+    expect(min(times) - 2 * second <= start <= min(times), f"part {options}: first fix at {start}")
+    expect(max(times) <= end <= max(times) + 2 * second, f"part {options}: last fix at {end}")
+
+
+def check_events(recording: Path) -> None:
+    """Events lie on the road, where their samples lie, in all formats."""
+    rows = list(csv.DictReader(io.StringIO(run(LOG, "events", "--format", "csv", recording))))
+    placed = [row for row in rows if row["latitude"] and row["longitude"]]
+    expect(len(placed) > 10 and len(placed) > 0.9 * len(rows), f"{len(placed)} of {len(rows)} events have a position")
+    places = {row["time"]: (row["latitude"], row["longitude"]) for row in samples(LOG, recording) if row["latitude"]}
+    for row in placed:
+        place = (row["latitude"], row["longitude"])
+        expect(distance_from_road(*map(float, place)) < 1, f"event {row['kind']} at {row['time']} is not on the road")
+        expect(places.get(row["time"], place) == place, f"event {row['kind']} at {row['time']}: {place}")
+    expect(sum(1 for row in placed if row["time"] in places) > 10, "events at the times of samples")
+    lines = [json.loads(line) for line in run(LOG, "events", "--format", "jsonl", recording).splitlines()]
+    found = [(f"{line['latitude']:.7f}", f"{line['longitude']:.7f}") if "latitude" in line else ("", "") for line in lines]
+    expect(found == [(row["latitude"], row["longitude"]) for row in rows], "jsonl has other positions than csv")
+    text = run(LOG, "events", "--positions", recording).splitlines()
+    for row, line in zip(rows, text, strict=True):
+        shown = re.search(r"  (-?\d+\.\d{6}) (-?\d+\.\d{6})  ", line)
+        expect(bool(shown) == bool(row["latitude"]), f"text: {line}")
+        for text_place, column in zip(shown.groups() if shown else (), ("latitude", "longitude")):
+            expect(abs(float(text_place) - float(row[column])) < 6e-7, f"text, {column} {row[column]}: {line}")
+    expect(not re.search(r"\.\d{6} ", run(LOG, "events", recording)), "text has positions without --positions")
+    for options in (("--clock", "modem"), ("--mask=all",)):
+        hidden = csv.DictReader(io.StringIO(run(LOG, "events", "--format", "csv", *options, recording)))
+        expect(not any(row["latitude"] or row["longitude"] for row in hidden), f"positions with {options}")
+    run(LOG, "events", "--positions", "--clock", "modem", recording, status=2)
+    run(LOG, "events", "--positions", "--format", "csv", recording, status=2)
+    run(LOG, "events", "--positions", "--duration", "1", status=2)
+
+
 with tempfile.TemporaryDirectory() as temporary:
     directory = Path(temporary)
     for scenario in ("gsm", "c2k", "lte", "utran", "ifx", "modem"):
@@ -111,6 +159,9 @@ with tempfile.TemporaryDirectory() as temporary:
     expect(copied.read_bytes() == gsm.read_bytes(), "a copy of a recording differs")
 
     check_squares(gsm)
+    check_events(gsm)
+    check_part(gsm, directory / "part.pcapng", "--from", "+20", "--to", "+30")
+    check_part(merged, directory / "part.pcapng", "--from", "2026-01-05T08:00:20.5Z", "--to", "2026-01-05T08:00:21.5Z")
 
     # What masking and other forms leave of them.
     key = directory / "key"

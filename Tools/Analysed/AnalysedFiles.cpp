@@ -61,8 +61,10 @@ bool analyseFile(std::uint32_t index, const AnalysedInput& input, std::optional<
     const DecoderLog log(lines);
     const TrackedResources resources;
     std::optional<PositionedReader> positioned;
+    if (input.positions || input.fixes)
+        positioned.emplace(**reader, input.maximumGap).setFixes(input.fixes);
     if (input.positions)
-        input.positions(&positioned.emplace(**reader, input.maximumGap));
+        input.positions(&*positioned);
     MaskedInput masked(
         positioned ? *positioned : **reader, path, input.technology,
         masking && !input.technology.empty() ? technologiesOf(path) : std::vector<std::string>(), masking);

@@ -5,6 +5,7 @@
 
 #include "Export/Masking/Pseudonyms.h"
 #include "Export/Tracks/PositionedReader.h"
+#include "Platform/Fix.h"
 #include "Tools/Analysed/AnalysisFeed.h"
 #include "Tools/Log/DecoderLines.h"
 
@@ -28,6 +29,8 @@ struct AnalysedInput {
     /// Gets the reader of the positions of the next file's messages, and null after them; null where
     /// positions are not needed.
     std::function<void(const PositionedReader* positions)> positions = {};
+    /// Gets the fixes of the files: all that a message's position depends on before that message.
+    std::function<void(const Fix& fix)> fixes = {};
     std::chrono::nanoseconds maximumGap = Track::defaultGap; ///< between fixes
     std::function<void()> beforeWaiting = {};                ///< more is waited for, as of a pipe
     std::function<bool()> whileWaiting = {};                 ///< as FileSource's hook

@@ -10,12 +10,12 @@
 #include "Platform/TelephonyService.h"
 #include "PropertyLists/PropertyList.h"
 #include "Recording/DLF/DLFWriter.h"
-#include "Recording/Files/DescriptorFile.h"
 #include "Recording/Pcapng/PcapngReader.h"
 #include "Recording/Pcapng/PcapngWriter.h"
-#include "Recording/Pcapng/RecordingCopy.h"
 #include "Recording/Refreshes/RefreshTicks.h"
 #include "Tools/Convert/AddedPositions.h"
+#include "Tools/Convert/RecordingConversion.h"
+#include "Tools/Convert/SelectedMessages.h"
 #include "Tools/Convert/TrackConversion.h"
 #include "Tools/Decode/Decoding.h"
 #include "Tools/Messages/TechnologyChoice.h"
@@ -31,46 +31,6 @@ namespace velmora {
 
 namespace {
 
-/// The selected messages of a file, the first of which has been read: a file may name its technology no
-/// earlier than there.
-struct Messages {
-    MessageReader& reader;
-    MessageFilter filter;
-    std::optional<LoggedMessage> next;
-    std::string technology = {}; ///< the short name of the first, or of the chosen one
-    bool isOne = false;          ///< by --technology
-
-    void advance() {
-        do
-            next = reader.next();
-        while (next && !filter.passes(*next));
-    }
-};
-
-Result<Messages> begin(MessageReader& reader, const Conversion& conversion) {
-    Messages messages{reader, MessageFilter(conversion.messages), {}};
-    reader.setReadsAllTechnologies(true);
-    std::optional<LoggedMessage> first = reader.next();
-    const std::vector<std::string> technologies = knownTechnologies(conversion.technologies, reader);
-    const Result<TechnologyChoice> choice = TechnologyChoice::make(conversion.technology, technologies);
-    if (!choice)
-        return Failure{conversion.title + ": " + choice.reason()};
-    const std::string named = choice->nameOf(choice->only.value_or(0), technologies);
-    if (const Result<std::string> technology = technologyNamed(named); !technology)
-        return Failure{conversion.title + ": " + technology.reason() +
-                       (named.empty() ? "; --technology supplies it" : "")};
-    messages.technology = named;
-    if (choice->only)
-        messages.filter.setTechnology(*choice->only);
-    else if (!choice->override.empty())
-        reader.setReadsAllTechnologies(false);
-    messages.isOne = choice->only || !choice->override.empty();
-    messages.next = std::move(first);
-    if (messages.next && !messages.filter.passes(*messages.next))
-        messages.advance();
-    return messages;
-}
-
 /// A second descriptor of the file, for a writer that closes its descriptor.
 Result<int> ownDescriptor(int descriptor, const std::string& name) {
     const int copy = ::fcntl(descriptor, F_DUPFD_CLOEXEC, 0);
@@ -79,40 +39,11 @@ Result<int> ownDescriptor(int descriptor, const std::string& name) {
     return copy;
 }
 
-/// A recording of a recording: what is not known here is kept.
-Result<bool> copyRecording(PcapngReader& reader, const Conversion& conversion, int descriptor) {
-    // The first blocks are copied before the first message is read.
-    const std::vector<std::string> technologies = knownTechnologies(conversion.technologies, reader);
-    const Result<TechnologyChoice> choice = TechnologyChoice::make(conversion.technology, technologies);
-    if (!choice)
-        return Failure{conversion.title + ": " + choice.reason()};
-    RecordingCopy copy(reader, std::make_unique<DescriptorFile>(descriptor, false), conversion.name,
-                       {choice->override, choice->only ? technologies[*choice->only] : std::string()});
-    Result<Messages> messages = begin(reader, conversion);
-    if (!messages)
-        return Failure{messages.reason()};
-    AddedPositions positions(conversion.positions);
-    const auto add = [&copy](const Fix& fix) { return copy.addFix(fix); };
-    for (; messages->next; messages->advance()) {
-        if (const auto added = positions.upTo(messages->next->time, add); !added)
-            return Failure{conversion.title + ": " + added.reason()};
-        if (const auto added = copy.addMessage(); !added)
-            return Failure{added.reason()};
-    }
-    if (const auto added = positions.finish(add); !added)
-        return Failure{conversion.title + ": " + added.reason()};
-    if (!choice->override.empty() && reader.technologies().size() > 1)
-        return Failure{conversion.title + ": " + severalTechnologies(reader.technologies()) +
-                       " of a regular file only"};
-    if (const auto finished = copy.finish(); !finished)
-        return Failure{finished.reason()};
-    return true;
-}
-
 Result<bool> toRecording(MessageReader& reader, const Conversion& conversion, int descriptor) {
     if (auto* recording = dynamic_cast<PcapngReader*>(&reader))
-        return copyRecording(*recording, conversion, descriptor);
-    Result<Messages> messages = begin(reader, conversion);
+        return convertRecording(*recording, conversion, descriptor);
+    MessageFilter filter(conversion.messages);
+    Result<SelectedMessages> messages = SelectedMessages::begin(reader, conversion, filter);
     if (!messages)
         return Failure{messages.reason()};
     const Result<int> own = ownDescriptor(descriptor, conversion.name);
@@ -141,7 +72,8 @@ Result<bool> toRecording(MessageReader& reader, const Conversion& conversion, in
 }
 
 Result<bool> toDLFLog(MessageReader& reader, const Conversion& conversion, int descriptor) {
-    Result<Messages> messages = begin(reader, conversion);
+    MessageFilter filter(conversion.messages);
+    Result<SelectedMessages> messages = SelectedMessages::begin(reader, conversion, filter);
     if (!messages)
         return Failure{messages.reason()};
     const auto refuses = [&] { return !messages->isOne && reader.technologies().size() > 1; };

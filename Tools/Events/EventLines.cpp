@@ -3,6 +3,7 @@
 
 #include "Tools/Events/EventLines.h"
 
+#include "Tools/Decode/Samples/PositionCells.h"
 #include "Tools/Decode/Samples/SampleText.h"
 #include "Tools/Text/JSONText.h"
 
@@ -50,6 +51,7 @@ void EventLines::append(const Event& event, EventState state) {
     appendJsonString(line(), event.text);
     appendFields(event);
     appendEvidence(event);
+    appendPlaceMembers(line(), place());
     line().append("}\n");
 }
 

@@ -4,6 +4,7 @@
 #pragma once
 
 #include "Analysis/Events/EventSink.h"
+#include "Analysis/Tracks/PlaceHistory.h"
 #include "Tools/Analysed/AnalysisFeed.h"
 #include "Tools/Events/EventOrder.h"
 #include "Tools/Events/EventWriter.h"
@@ -22,6 +23,8 @@ public:
 
     /// The feed whose messages make the events; before the first of them.
     void setFeed(const AnalysisFeed& feed) { _feed = &feed; }
+    /// The places of the events, from before the first of them; null for none. Must outlive it.
+    void setPlaces(const PlaceHistory* places) { _places = places; }
     void began(const Event& event) override;
     void happened(const Event& event) override;
     /// There are no more events.
@@ -33,12 +36,14 @@ public:
 private:
     /// The time of the first message of all.
     [[nodiscard]] Time first(const Event& event) const { return _feed->first().value_or(event.time); }
-    void list(const Event& event, EventState state);
+    [[nodiscard]] std::optional<Coordinates> placeOf(const Event& event) const;
+    void list(const Event& event, EventState state, const std::optional<Coordinates>& place);
 
     const EventsOptions& _options;
     EventWriter& _writer;
     EventPrograms* _programs;
     const AnalysisFeed* _feed = nullptr;
+    const PlaceHistory* _places = nullptr;
     EventOrder _order;
     std::optional<Severity> _greatest;
 };

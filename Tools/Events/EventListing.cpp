@@ -33,6 +33,10 @@ EventListing::EventListing(const EventsOptions& options, const RuleSet& rules, O
         return analysis;
     });
     _list->setFeed(*_feed);
+    // Fixes have times of arrival.
+    const bool showsPlaces = _options.format != EventsOptions::Format::Text || _options.hasPositions;
+    if (showsPlaces && !_options.files.empty() && _options.clock == AnalysisClock::Arrival)
+        _list->setPlaces(&_places.emplace(_options.maximumGap));
     _writer->begin();
 }
 
@@ -42,7 +46,8 @@ std::unique_ptr<EventWriter> EventListing::makeWriter() {
     case EventsOptions::Format::Csv: return std::make_unique<EventRows>(_output, _names, _options.guard);
     case EventsOptions::Format::Text: break;
     }
-    return std::make_unique<EventText>(_output, _names, EventText::Columns{_options.hasEvidence},
+    return std::make_unique<EventText>(_output, _names,
+                                       EventText::Columns{_options.hasEvidence, _options.hasPositions},
                                        [this] { return _feed && _feed->technologies() > 1; });
 }
 

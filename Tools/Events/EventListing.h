@@ -4,6 +4,7 @@
 #pragma once
 
 #include "Analysis/Rules/RuleSet.h"
+#include "Analysis/Tracks/PlaceHistory.h"
 #include "Tools/Analysed/AnalysisFeed.h"
 #include "Tools/Events/EventList.h"
 #include "Tools/Events/EventWriter.h"
@@ -30,6 +31,8 @@ public:
     [[nodiscard]] AnalysisFeed& feed() { return *_feed; }
     /// Null where none are to be run.
     [[nodiscard]] EventPrograms* programs() { return _programs ? &*_programs : nullptr; }
+    /// Where the fixes of the messages go; null where no position is listed.
+    [[nodiscard]] PlaceHistory* places() { return _places ? &*_places : nullptr; }
     /// Writes out what is complete.
     void flush() { _writer->flush(); }
     /// Whether no further event can matter: the reader has closed the output, and nothing else asks for them.
@@ -47,6 +50,7 @@ private:
     EvidenceNames _names;
     std::unique_ptr<EventWriter> _writer;
     std::optional<EventPrograms> _programs;
+    std::optional<PlaceHistory> _places;
     std::optional<EventList> _list;
     std::optional<AnalysisFeed> _feed;
 };

@@ -4,11 +4,13 @@
 #pragma once
 
 #include "Analysis/Events/Event.h"
+#include "Analysis/Tracks/Geodesy.h"
 
 #include <cstddef>
 #include <cstdint>
 #include <functional>
 #include <map>
+#include <optional>
 #include <string>
 #include <tuple>
 #include <utility>
@@ -22,10 +24,13 @@ class EventOrder {
 public:
     static constexpr std::size_t mostHeld = 4096;
 
-    explicit EventOrder(std::function<void(const Event&)> pass) : _pass(std::move(pass)) {}
+    /// Gets each event with where it happened or began, if that is known.
+    using Pass = std::function<void(const Event& event, const std::optional<Coordinates>& place)>;
 
-    void add(const Event& event) {
-        _held.emplace(Key{event.time, event.kind, _added++}, event);
+    explicit EventOrder(Pass pass) : _pass(std::move(pass)) {}
+
+    void add(const Event& event, const std::optional<Coordinates>& place = {}) {
+        _held.emplace(Key{event.time, event.kind, _added++}, Held{event, place});
         if (_held.size() > mostHeld)
             passFirst();
     }
@@ -36,16 +41,21 @@ public:
     }
 
 private:
+    struct Held {
+        Event event;
+        std::optional<Coordinates> place;
+    };
     /// The last one keeps the order in which events became known.
     using Key = std::tuple<Time, std::string, std::uint64_t>;
 
     void passFirst() {
-        _pass(_held.begin()->second);
+        const Held& first = _held.begin()->second;
+        _pass(first.event, first.place);
         _held.erase(_held.begin());
     }
 
-    std::function<void(const Event&)> _pass;
-    std::map<Key, Event> _held;
+    Pass _pass;
+    std::map<Key, Held> _held;
     std::uint64_t _added = 0;
 };
 

@@ -3,6 +3,7 @@
 
 #include "Tools/Events/EventRows.h"
 
+#include "Tools/Decode/Samples/PositionCells.h"
 #include "Tools/Events/EventText.h"
 
 #include <algorithm>
@@ -21,7 +22,7 @@ void EventRows::begin() {
     std::string header = "time,end,state,severity,kind,technology,text";
     for (const std::string_view column : columns)
         header.append(",").append(column);
-    put(header + ",unit,fields,evidence" + std::string(csvRowEnd));
+    put(header.append(",unit,fields,evidence").append(placeColumns).append(csvRowEnd));
 }
 
 void EventRows::append(const Event& event, EventState state) {
@@ -44,6 +45,7 @@ void EventRows::append(const Event& event, EventState state) {
         line().append(nameOf(value->unit));
     appendOthers(event);
     appendEvidence(event);
+    appendPlaceCells(line(), place());
     line().append(csvRowEnd);
 }
 

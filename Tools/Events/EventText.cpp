@@ -20,6 +20,7 @@ constexpr std::size_t durationWidth = 10;
 constexpr std::size_t severityWidth = 8;
 constexpr std::size_t kindWidth = 18;
 constexpr std::size_t technologyWidth = 13;
+constexpr std::size_t placeWidth = 22;
 
 /// "12.3 s" of an event that lasts; nothing of one that happens at a moment.
 std::string durationOf(const Event& event, EventState state) {
@@ -32,6 +33,15 @@ std::string durationOf(const Event& event, EventState state) {
     char text[32];
     std::snprintf(text, sizeof text, "%.1f s",
                   std::chrono::duration<double>(*event.end - event.time).count());
+    return text;
+}
+
+/// "59.333333 -18.050000": latitude and longitude, empty where they are not known.
+std::string placeText(const std::optional<Coordinates>& place) {
+    if (!place)
+        return {};
+    char text[64];
+    std::snprintf(text, sizeof text, "%.6f %.6f", place->latitude, place->longitude);
     return text;
 }
 
@@ -72,6 +82,8 @@ void EventText::append(const Event& event, EventState state) {
     appendPadded(printable(event.kind), kindWidth);
     if (_hasSeveralTechnologies())
         appendPadded(printable(event.technology), technologyWidth);
+    if (_columns.hasPlace)
+        appendPadded(placeText(place()), placeWidth);
     line().append(printable(event.text));
     if (_columns.hasEvidence && !event.evidence.empty()) {
         line().append("  [");

@@ -23,6 +23,7 @@ class EventText final : public EventWriter {
 public:
     struct Columns {
         bool hasEvidence = false; ///< at the end of each line
+        bool hasPlace = false;    ///< before the text
     };
 
     /// `names` must outlive it. `hasSeveralTechnologies`: whether there have been several so far.

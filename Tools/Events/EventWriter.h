@@ -4,12 +4,15 @@
 #pragma once
 
 #include "Analysis/Events/Event.h"
+#include "Analysis/Tracks/Geodesy.h"
 #include "Tools/Output.h"
 #include "Tools/Text/TextBuffer.h"
 #include "Tools/Text/TimeText.h"
 
 #include <cstddef>
+#include <optional>
 #include <string>
+#include <string_view>
 #include <vector>
 
 namespace velmora {
@@ -39,7 +42,9 @@ public:
 
     /// Before the first event.
     virtual void begin() {}
-    void write(const Event& event, EventState state) {
+    /// `place`: where the event happened or began, if that is known.
+    void write(const Event& event, EventState state, const std::optional<Coordinates>& place = {}) {
+        _place = place;
         append(event, state);
         _output.put(_line.view());
         _line.clear();
@@ -50,6 +55,8 @@ protected:
     /// Appends the event's line.
     virtual void append(const Event& event, EventState state) = 0;
     [[nodiscard]] TextBuffer& line() { return _line; }
+    /// The event's.
+    [[nodiscard]] const std::optional<Coordinates>& place() const { return _place; }
     void appendTime(Time time) { _time.append(_line, time); }
     void put(std::string_view text) { _output.put(text); }
 
@@ -57,6 +64,7 @@ private:
     Output& _output;
     TextBuffer _line;
     TimeText _time;
+    std::optional<Coordinates> _place;
 };
 
 } // namespace velmora

@@ -5,6 +5,7 @@
 
 #include "Tools/CommandOptions.h"
 #include "Tools/Events/Programs/CommandText.h"
+#include "Tools/Messages/PositionOptions.h"
 #include "Tools/Messages/SelectionOptions.h"
 
 #include <sstream>
@@ -23,7 +24,17 @@ void checkTogether(const EventsOptions& options) {
     if (options.hasEvidence && options.format != Format::Text)
         throw CLI::ValidationError("--records", "got another format, wanted --format text: the others have "
                                                 "them");
+    if (options.hasPositions && options.format != Format::Text)
+        throw CLI::ValidationError("--positions", "got another format, wanted --format text: the others have "
+                                                  "them");
+    if (options.hasPositions && options.clock != AnalysisClock::Arrival)
+        throw CLI::ValidationError("--positions",
+                                   "got --clock modem, wanted --clock arrival, by which positions are "
+                                   "known");
     if (options.files.empty()) {
+        if (options.hasPositions)
+            throw CLI::ValidationError("--positions",
+                                       "got no FILE, wanted one: the telephony service has none");
         if (!options.technology.empty())
             throw CLI::ValidationError("--technology", "got no FILE, wanted one: the telephony service names "
                                                        "its technology");
@@ -94,6 +105,10 @@ void addFormat(CLI::App& command, EventsOptions& options) {
     addSafe(command, options.guard);
     command.add_flag("--records", options.hasEvidence,
                      "With text: at the end of each line the numbers of the records that made the event");
+    command.add_flag("--positions", options.hasPositions,
+                     "With text: where the receiver was when the event happened or began, of recordings with "
+                     "positions; csv and jsonl have it anyway");
+    addMaximumGap(command, options.maximumGap);
     command.add_flag("--live", options.isLive,
                      "Write each event as soon as it is known, one that lasts at its begin too, as without a "
                      "FILE: for a pipe; by default events are sorted by their begin");

@@ -4,11 +4,13 @@
 #pragma once
 
 #include "Analysis/Events/Event.h"
+#include "Analysis/Tracks/Track.h"
 #include "Tools/Analysed/AnalysisClock.h"
 #include "Tools/Events/EventSelection.h"
 #include "Tools/Mask/MaskOption.h"
 #include "Tools/Text/CSVText.h"
 
+#include <chrono>
 #include <cstdint>
 #include <optional>
 #include <string>
@@ -28,6 +30,8 @@ struct EventsOptions {
     Format format = Format::Text;
     CSVGuard guard = CSVGuard::Off; ///< for Csv alone
     bool hasEvidence = false;       ///< for Text: the records at the end of each line
+    bool hasPositions = false;      ///< for Text: where events happened or began
+    std::chrono::nanoseconds maximumGap = Track::defaultGap; ///< between fixes
     EventSelection selection;
     AnalysisClock clock = AnalysisClock::Arrival;
     std::string technology; ///< overrides the files', or chooses one of several; empty for the files'

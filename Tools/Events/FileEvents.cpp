@@ -52,6 +52,12 @@ int listFileEvents(const EventsOptions& options, const RuleSet& rules,
     input.files = options.files;
     input.technology = options.technology;
     input.masking = masking;
+    // What is masked has no positions at that level, and the times of the messages differ from those of the
+    // fixes.
+    const bool hasPlaces = !masking || masking->level < MaskLevel::All;
+    if (PlaceHistory* const places = hasPlaces ? listing.places() : nullptr)
+        input.fixes = [places](const Fix& fix) { places->add(fix); };
+    input.maximumGap = options.maximumGap;
     input.writesAsItGoes = true;
     input.beforeWaiting = [&listing] { listing.flush(); };
     input.cleanUp = [&listing] { listing.flush(); };

@@ -46,6 +46,8 @@ public:
                (_selection.codes.empty() || hasCode(message));
     }
 
+    /// The time of the file's first message; absent before it.
+    [[nodiscard]] const std::optional<Time>& first() const { return _first; }
     /// Whether what happens at that time is to be written. Precondition: there has been a message.
     [[nodiscard]] bool writes(Time moment) const {
         return !_selection.isWarm || TimeRange{_selection.range.from, std::nullopt}.contains(moment, *_first);

@@ -70,11 +70,16 @@ TEST(TrackFile, readsGPX10) {
 }
 
 TEST(TrackFile, refusesWhatIsNoTrack) {
-    EXPECT_EQ(reasonOf(fixesOfTrackFile("")), "no NMEA sentence and no GPX");
-    EXPECT_EQ(reasonOf(fixesOfTrackFile("<kml/>")), "root element is kml, wanted gpx");
-    EXPECT_EQ(reasonOf(fixesOfTrackFile("<gpx><trk><trkseg><trkpt lat='1' lon='2'/></trkseg></trk></gpx>")),
-              "none of 1 track points has a place and a time");
-    EXPECT_EQ(reasonOf(fixesOfTrackFile("<gpx>")).substr(0, 8), "no GPX: ");
+    for (const char* const empty : {"", " \r\n\n"})
+        EXPECT_EQ(reasonOf(fixesOfTrackFile(empty)), "empty, wanted GPX or NMEA sentences");
+    EXPECT_EQ(reasonOf(fixesOfTrackFile("time,latitude\n1,2\n")), "line 1: no NMEA sentence and no GPX");
+    EXPECT_EQ(reasonOf(fixesOfTrackFile("\n\nPK")), "line 3: no NMEA sentence and no GPX");
+    EXPECT_EQ(reasonOf(fixesOfTrackFile("<?xml version='1.0'?>\n<kml/>")),
+              "line 2: root element is kml, wanted gpx");
+    EXPECT_EQ(reasonOf(fixesOfTrackFile("<gpx/>")), "no track points");
+    EXPECT_EQ(reasonOf(fixesOfTrackFile("<gpx><trk><trkseg>\n<trkpt lat='1' lon='2'/></trkseg></trk></gpx>")),
+              "line 2: none of 1 track points has a place and a time");
+    EXPECT_EQ(reasonOf(fixesOfTrackFile("<gpx>\n <trk>\n</gpx>")).substr(0, 16), "line 3: no GPX: ");
     EXPECT_EQ(
         reasonOf(fixesOfTrackFile(nmea0183("GPGGA,123519,4807.038,N,01131.000,E,1,08,0.9,545.4,M,46.9,M,,"))),
         "no date, wanted RMC or ZDA sentences");

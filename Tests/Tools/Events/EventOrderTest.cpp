@@ -18,7 +18,7 @@ using testing::IsEmpty;
 class EventOrderTest : public testing::Test {
 protected:
     std::vector<std::string> _passed;
-    EventOrder _order{[this](const Event& event) { _passed.push_back(event.kind); }};
+    EventOrder _order{[this](const Event& event, const auto&) { _passed.push_back(event.kind); }};
 };
 
 TEST_F(EventOrderTest, EventsAreSortedByBegin) {
@@ -31,7 +31,7 @@ TEST_F(EventOrderTest, EventsAreSortedByBegin) {
 
 TEST_F(EventOrderTest, SimultaneousEventsAreSortedByKindAndThenAsTheyBecameKnown) {
     std::vector<std::string> texts;
-    EventOrder order([&](const Event& event) { texts.push_back(event.kind + event.text); });
+    EventOrder order([&](const Event& event, const auto&) { texts.push_back(event.kind + event.text); });
     for (const auto& [kind, text] : {std::pair{"b", "2"}, {"a", "2"}, {"b", "1"}, {"a", "1"}}) {
         Event event = eventAt(5, kind);
         event.text = text;

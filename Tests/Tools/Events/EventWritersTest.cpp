@@ -148,9 +148,32 @@ TEST_F(EventWritersTest, RowsHaveColumnsForTheCommonFields) {
     event.fields.push_back({"duration", 12.0, Unit::Second});
     EXPECT_EQ(asRows(event),
               "time,end,state,severity,kind,technology,text,from,to,value,cause,duration,unit,fields,"
-              "evidence\r\n"
+              "evidence,latitude,longitude\r\n"
               "2026-11-16T05:00:00.001000000Z,,complete,info,handover,Ostrel_LTE,handover from PCI 1 to PCI "
-              "62,PCI 1,PCI 62,-3.5,,12,dB,to.level=-97.25; known=true,a.pcapng:12 b.pcapng:3\r\n");
+              "62,PCI 1,PCI 62,-3.5,,12,dB,to.level=-97.25; known=true,a.pcapng:12 b.pcapng:3,,\r\n");
+}
+
+TEST_F(EventWritersTest, AllFormsHaveThePlace) {
+    const Coordinates place{59.33333333, -18.05};
+    const auto endsWith = [](const std::string& text, std::string_view end) {
+        EXPECT_TRUE(text.ends_with(end)) << text;
+    };
+    endsWith(written([&](Output& output) { EventLines(output, _names).write(eventAt(0), {}, place); }),
+             R"("evidence":[],"latitude":59.3333333,"longitude":-18.0500000})"
+             "\n");
+    endsWith(written([&](Output& output) { EventRows(output, _names, {}).write(eventAt(0), {}, place); }),
+             ",,,59.3333333,-18.0500000\r\n");
+    Event event = eventAt(0);
+    event.text = "here";
+    const auto asPlacedText = [&](const std::optional<Coordinates>& where) {
+        return written([&](Output& output) {
+            EventText(output, _names, {false, true}, [] {
+                return false;
+            }).write(event, EventState::Complete, where);
+        });
+    };
+    endsWith(asPlacedText(place), "handover            59.333333 -18.050000    here\n");
+    endsWith(asPlacedText({}), "handover                                    here\n");
 }
 
 TEST_F(EventWritersTest, RowsCanBeGuardedAgainstFormulas) {

@@ -33,6 +33,8 @@ TEST_F(EventsSchemaTest, CheckerFindsWhatIsWrong) {
         R"({"time":"2026-11-16T05:00:00.000000000Z","state":"complete","kind":"gap","severity":"info",)"
         R"("technology":"IFX","text":"","fields":{"value":1},"units":{"value":"dB"},"evidence":[{"record":1}]})";
     EXPECT_EQ(checkJSON(schemaFile, good + "\n"), "1\n");
+    const std::string placed = R"({"latitude":-59.5,"longitude":-180,)" + good.substr(1);
+    EXPECT_EQ(checkJSON(schemaFile, placed + "\n"), "1\n");
     for (const auto& [part, bad] : {
              std::pair{"05:00:00.000000000Z", "05:00:00Z"},
              {"\"complete\"", "\"ended\""},
@@ -45,6 +47,9 @@ TEST_F(EventsSchemaTest, CheckerFindsWhatIsWrong) {
              {"{\"record\":1}", "{\"record\":0}"},
              {"{\"record\":1}", "{\"file\":\"a\"}"},
              {"\"kind\"", "\"more\":1,\"kind\""},
+             {"\"kind\"", "\"latitude\":59.5,\"kind\""}, // without the other
+             {"\"kind\"", "\"latitude\":90.5,\"longitude\":18,\"kind\""},
+             {"\"kind\"", "\"latitude\":59.5,\"longitude\":180,\"kind\""},
          }) {
         std::string text = good;
         text.replace(text.find(part), std::string(part).size(), bad);

@@ -12,6 +12,9 @@ namespace velmora {
 
 namespace {
 
+/// A centimetre.
+constexpr int degreeDecimals = 7;
+
 struct Cell {
     std::string_view member;
     int decimals;
@@ -20,8 +23,8 @@ struct Cell {
 
 std::array<Cell, 7> cellsOf(const Position& position) {
     const Fix& fix = position.fix;
-    return {{{"latitude", 7, fix.latitude},
-             {"longitude", 7, fix.longitude},
+    return {{{"latitude", degreeDecimals, fix.latitude},
+             {"longitude", degreeDecimals, fix.longitude},
              {"altitude", 2, fix.altitude_m},
              {"speed", 2, fix.speed_mps},
              {"fixAge", 3, std::chrono::duration<double>(position.age).count()},
@@ -45,6 +48,24 @@ void appendPositionCells(TextBuffer& out, const std::optional<Position>& positio
         if (position && cell.value)
             appendDecimals(out, *cell.value, cell.decimals);
     }
+}
+
+void appendPlaceCells(TextBuffer& out, const std::optional<Coordinates>& place) {
+    out.append(',');
+    if (place)
+        appendDecimals(out, place->latitude, degreeDecimals);
+    out.append(',');
+    if (place)
+        appendDecimals(out, place->longitude, degreeDecimals);
+}
+
+void appendPlaceMembers(TextBuffer& out, const std::optional<Coordinates>& place) {
+    if (!place)
+        return;
+    out.append(",\"latitude\":");
+    appendDecimals(out, place->latitude, degreeDecimals);
+    out.append(",\"longitude\":");
+    appendDecimals(out, place->longitude, degreeDecimals);
 }
 
 void appendPositionMembers(TextBuffer& out, const std::optional<Position>& position) {

@@ -3,6 +3,7 @@
 
 #pragma once
 
+#include "Analysis/Tracks/Geodesy.h"
 #include "Analysis/Tracks/Position.h"
 #include "Tools/Text/TextBuffer.h"
 
@@ -19,7 +20,13 @@ inline constexpr std::string_view positionColumns =
 /// a second, seconds.
 void appendPositionCells(TextBuffer& out, const std::optional<Position>& position);
 
-/// The same as members of a JSON object, each after a comma: those alone that there are.
+/// The columns of a place, and its two cells, each after a comma; empty where it is absent.
+inline constexpr std::string_view placeColumns = ",latitude,longitude";
+void appendPlaceCells(TextBuffer& out, const std::optional<Coordinates>& place);
+/// The same as members of a JSON object, each after a comma; nothing where it is absent.
+void appendPlaceMembers(TextBuffer& out, const std::optional<Coordinates>& place);
+
+/// A position as members of a JSON object, each after a comma: those alone that there are.
 void appendPositionMembers(TextBuffer& out, const std::optional<Position>& position);
 
 } // namespace velmora

@@ -40,6 +40,8 @@ void RecordedPositions::start(ServiceClient& client, Events events) {
     const Time begin = client.clock.now();
     while (_next < _fixes.size() && _fixes[_next].time < begin)
         ++_next;
+    if (!_fixes.empty() && _next == _fixes.size())
+        _events.news(_choice.path + ": all of its fixes are before now; recording goes on without positions");
     PositionSource::Events sourceEvents{
         [this, &client](std::string_view sentence) { _events.sentence(client.clock.now(), sentence); },
         [this](const std::string& text) { _events.news(text); }};
