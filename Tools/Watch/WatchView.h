@@ -6,7 +6,7 @@
 #include "Tools/LogOverride.h"
 #include "Tools/Output.h"
 #include "Tools/Text/TreeText.h"
-#include "Tools/Watch/Terminal.h"
+#include "Tools/Terminal/Terminal.h"
 
 #include <functional>
 #include <memory>

@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Tools/Watch/KeyReader.h"
+#include "Tools/Terminal/KeyReader.h"
 
 #include <gmock/gmock.h>
 

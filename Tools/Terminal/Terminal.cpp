@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Tools/Watch/Terminal.h"
+#include "Tools/Terminal/Terminal.h"
 
 #include <cerrno>
 #include <csignal>

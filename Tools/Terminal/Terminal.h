@@ -5,7 +5,7 @@
 
 #include "Platform/Linux/Files/FileDescriptor.h"
 #include "Platform/Linux/Ports/SocketWatch.h"
-#include "Tools/Watch/TerminalFrame.h"
+#include "Tools/Terminal/ScreenSize.h"
 
 #include <functional>
 #include <memory>
