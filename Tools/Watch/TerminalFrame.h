@@ -3,7 +3,7 @@
 
 #pragma once
 
-#include "Tools/Terminal/KeyReader.h"
+#include "Tools/Terminal/KeyPress.h"
 #include "Tools/Terminal/ScreenSize.h"
 #include "Tools/Text/TreeText.h"
 
@@ -50,7 +50,7 @@ inline constexpr ScreenSize smallestWithEvents{30, 8};
 /// Text in rows of at most that many columns, broken at blanks.
 [[nodiscard]] std::vector<TreeRow> adviceRows(std::string_view text, std::size_t columns);
 
-/// The scroll position after a key. `Quit` does not scroll.
+/// The scroll position after a key. What is no key to scroll by leaves it.
 [[nodiscard]] std::size_t scrolledBy(Key key, std::size_t scroll, const ScreenLayout& layout);
 
 } // namespace velmora
