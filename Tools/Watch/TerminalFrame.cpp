@@ -122,7 +122,7 @@ std::size_t scrolledBy(Key key, std::size_t scroll, const ScreenLayout& layout) 
     case Key::PageDown: return std::min(scroll + page, last);
     case Key::Home: return 0;
     case Key::End: return last;
-    case Key::Quit: break;
+    default: break;
     }
     return scroll;
 }

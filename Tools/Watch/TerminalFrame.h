@@ -3,8 +3,9 @@
 
 #pragma once
 
+#include "Tools/Terminal/KeyPress.h"
+#include "Tools/Terminal/ScreenSize.h"
 #include "Tools/Text/TreeText.h"
-#include "Tools/Watch/KeyReader.h"
 
 #include <cstddef>
 #include <string>
@@ -14,11 +15,6 @@
 namespace velmora {
 
 /// What a terminal shows of the display tree, as plain functions that need no terminal.
-
-struct ScreenSize {
-    std::size_t columns = 80;
-    std::size_t rows = 24;
-};
 
 /// How rows are laid out on a screen: in columns that are read one after the other, as many as the rows need
 /// and the window has width for, above the status line, which is the last row.
@@ -54,7 +50,7 @@ inline constexpr ScreenSize smallestWithEvents{30, 8};
 /// Text in rows of at most that many columns, broken at blanks.
 [[nodiscard]] std::vector<TreeRow> adviceRows(std::string_view text, std::size_t columns);
 
-/// The scroll position after a key. `Quit` does not scroll.
+/// The scroll position after a key. What is no key to scroll by leaves it.
 [[nodiscard]] std::size_t scrolledBy(Key key, std::size_t scroll, const ScreenLayout& layout);
 
 } // namespace velmora

@@ -85,12 +85,15 @@ void ScreenView::restoreTerminal() {
 
 void ScreenView::handleInput(std::string_view bytes) {
     const std::size_t before = _scroll;
-    for (const Key key : _keys.take(bytes)) {
-        if (key == Key::Quit) {
+    for (const KeyPress& press : _keys.take(bytes)) {
+        if (press.key == Key::Interrupt || press.text == "q") {
             _quit();
             return;
         }
-        _scroll = scrolledBy(key, _scroll, layoutOf(shownRows(), withoutEvents(_terminal.size(), _events)));
+        if (press.key == Key::Suspend)
+            _terminal.suspend();
+        _scroll = scrolledBy(scrollKey(press), _scroll,
+                             layoutOf(shownRows(), withoutEvents(_terminal.size(), _events)));
     }
     if (_scroll != before)
         draw();

@@ -5,8 +5,10 @@
 
 #include "Tools/LogOverride.h"
 #include "Tools/Output.h"
+#include "Tools/Terminal/KeyReader.h"
+#include "Tools/Terminal/Terminal.h"
 #include "Tools/Text/TreeText.h"
-#include "Tools/Watch/Terminal.h"
+#include "Tools/Watch/TerminalFrame.h"
 
 #include <functional>
 #include <memory>

@@ -1,7 +1,9 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Tools/Watch/Terminal.h"
+#include "Tools/Terminal/Terminal.h"
+
+#include "Tools/Terminal/CrashRestore.h"
 
 #include <cerrno>
 #include <csignal>
@@ -16,15 +18,15 @@ namespace velmora {
 
 namespace {
 
-constexpr std::string_view enter = "\x1b[?1049h\x1b[?25l\x1b[2J";
-constexpr std::string_view leave = "\x1b[0m\x1b[?25h\x1b[?1049l";
+constexpr std::string_view enterScreen = "\x1b[?1049h\x1b[?25l\x1b[2J";
+constexpr std::string_view leaveScreen = "\x1b[0m\x1b[?25h\x1b[?1049l";
 
-/// The signals that the terminal itself sends.
+/// The signals that the terminal itself sends, and those that stop and continue the program.
 sigset_t terminalSignals() {
     sigset_t signals;
     sigemptyset(&signals);
-    sigaddset(&signals, SIGWINCH);
-    sigaddset(&signals, SIGHUP);
+    for (const int number : {SIGWINCH, SIGHUP, SIGQUIT, SIGTSTP, SIGCONT})
+        sigaddset(&signals, number);
     return signals;
 }
 
@@ -54,11 +56,19 @@ bool Terminal::isThere() {
 
 Terminal::Terminal(Events events) : _events(std::move(events)) {
     watchSignals();
-    if (::isatty(STDIN_FILENO) != 0 && ::tcgetattr(STDIN_FILENO, &_earlier) == 0) {
-        _hasKeys = true;
+    _hasKeys = ::isatty(STDIN_FILENO) != 0 && ::tcgetattr(STDIN_FILENO, &_earlier) == 0;
+    if (_hasKeys)
+        _inputWatch =
+            std::make_unique<SocketWatch>(STDIN_FILENO, SocketWatch::For::Reading, [this] { handleInput(); });
+    enter();
+}
+
+void Terminal::enter() {
+    restoreTerminalOnCrash(leaveScreen, _hasKeys ? &_earlier : nullptr);
+    if (_hasKeys) {
         termios keys = _earlier;
-        // Ctrl-C stays a signal. The keys that suspend or abort a program do nothing, since the screen could
-        // not be restored.
+        // Ctrl-C stays a signal. The keys that stop or abort a program are read like others: the screen is
+        // restored first.
         keys.c_lflag &= ~static_cast<tcflag_t>(ICANON | ECHO | IEXTEN);
         keys.c_iflag &= ~static_cast<tcflag_t>(IXON);
         keys.c_cc[VSUSP] = _POSIX_VDISABLE;
@@ -66,10 +76,15 @@ Terminal::Terminal(Events events) : _events(std::move(events)) {
         keys.c_cc[VMIN] = 1;
         keys.c_cc[VTIME] = 0;
         ::tcsetattr(STDIN_FILENO, TCSANOW, &keys);
-        _inputWatch =
-            std::make_unique<SocketWatch>(STDIN_FILENO, SocketWatch::For::Reading, [this] { handleInput(); });
     }
-    writeAll(enter);
+    writeAll(enterScreen);
+}
+
+void Terminal::leave() {
+    writeAll(leaveScreen);
+    if (_hasKeys)
+        ::tcsetattr(STDIN_FILENO, TCSANOW, &_earlier);
+    forgetTerminalOnCrash();
 }
 
 Terminal::~Terminal() {
@@ -99,12 +114,18 @@ void Terminal::draw(std::string_view frame) {
         _events.hungUp();
 }
 
-void Terminal::restore() {
-    if (!std::exchange(_active, false))
+void Terminal::suspend() {
+    if (!_active)
         return;
-    writeAll(leave);
-    if (_hasKeys)
-        ::tcsetattr(STDIN_FILENO, TCSANOW, &_earlier);
+    leave();
+    ::raise(SIGSTOP);
+    enter();
+    _events.resized();
+}
+
+void Terminal::restore() {
+    if (std::exchange(_active, false))
+        leave();
 }
 
 void Terminal::handleInput() {
@@ -122,10 +143,18 @@ void Terminal::handleSignal() {
     signalfd_siginfo info = {};
     if (::read(_signals.get(), &info, sizeof info) != static_cast<ssize_t>(sizeof info))
         return;
-    if (info.ssi_signo == SIGWINCH)
-        _events.resized();
-    else
-        _events.hungUp();
+    switch (static_cast<int>(info.ssi_signo)) {
+    case SIGWINCH: _events.resized(); break;
+    case SIGTSTP: suspend(); break;
+    case SIGCONT:
+        // Stopped by a signal that cannot be caught: others have used the terminal.
+        if (_active) {
+            enter();
+            _events.resized();
+        }
+        break;
+    default: _events.hungUp(); break;
+    }
 }
 
 } // namespace velmora
