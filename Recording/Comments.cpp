@@ -9,11 +9,16 @@ namespace velmora {
 
 void Comments::add(Comment comment) {
     ++_count;
-    if (_first.size() == maximumKept)
+    const bool isNewKept = _new.size() < maximumKept;
+    const bool isFirstKept = _first.size() < maximumKept;
+    if (!isNewKept && !isFirstKept)
         return;
     if (comment.text.size() > maximumLength)
         comment.text.resize(maximumLength);
-    _first.push_back(std::move(comment));
+    if (isFirstKept)
+        _first.push_back(comment);
+    if (isNewKept)
+        _new.push_back(std::move(comment));
 }
 
 } // namespace velmora

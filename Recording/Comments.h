@@ -6,6 +6,7 @@
 #include <cstddef>
 #include <cstdint>
 #include <string>
+#include <utility>
 #include <vector>
 
 namespace velmora {
@@ -26,7 +27,7 @@ struct Comment {
     std::string text;         ///< as it is in the file: UTF-8 where the file is well-formed
 };
 
-/// The first comments of a file. Memory is bounded for any file.
+/// The first comments of a file, and the latest until they are taken. Memory is bounded for any file.
 class Comments {
 public:
     static constexpr std::size_t maximumKept = 100;
@@ -39,9 +40,13 @@ public:
     [[nodiscard]] const std::vector<Comment>& first() const { return _first; }
     /// How many there are in all.
     [[nodiscard]] std::uint64_t count() const { return _count; }
+    /// Those that were added since the last call, also ones that `first` has no place for; at most
+    /// `maximumKept` of them.
+    [[nodiscard]] std::vector<Comment> takeNew() { return std::exchange(_new, {}); }
 
 private:
     std::vector<Comment> _first;
+    std::vector<Comment> _new; ///< that have not been taken
     std::uint64_t _count = 0;
 };
 

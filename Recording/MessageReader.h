@@ -88,6 +88,8 @@ public:
     [[nodiscard]] const LossTotals& lossTotals() const { return _lossTotals; }
     /// The comments so far.
     [[nodiscard]] const Comments& comments() const { return _comments; }
+    /// Those since the last call; see Comments::takeNew.
+    [[nodiscard]] std::vector<Comment> takeNewComments() { return _comments.takeNew(); }
 
 protected:
     MessageReader() = default;

@@ -16,17 +16,19 @@ namespace velmora {
 
 namespace {
 
-bool isSameCell(const Neighbour& one, const Neighbour& other) {
-    return one.technology == other.technology && one.channel == other.channel &&
-           one.physicalCell == other.physicalCell;
-}
-
 CellIdentity identityOf(const Neighbour& neighbour) {
     CellIdentity cell;
     cell.technology = neighbour.technology;
     cell.channel = neighbour.channel;
     cell.physicalCell = neighbour.physicalCell;
     return cell;
+}
+
+/// Some reports of GSM cells have no BSIC: of those that a phone hears the channel alone distinguishes them.
+bool isCell(const Neighbour& neighbour, const CellIdentity& cell) {
+    const bool isOnChannel = neighbour.channel && neighbour.channel == cell.channel;
+    return areSameCell(identityOf(neighbour), cell)
+        .value_or(isOnChannel && neighbour.technology == RadioTechnology::GSM);
 }
 
 bool areComparable(const Neighbour& neighbour, const CellIdentity& serving) {
@@ -57,7 +59,9 @@ void ReselectionsDetector::report(const MessageReport& report, const RadioPictur
 void ReselectionsDetector::compare(const MessageReport& report, const RadioPicture& picture) {
     const Reading* const level = picture.find(Role::ServingLevel);
     // What is compared with the serving cell's level is of the same message, or nearly so.
-    if (level && level->message != report.message && picture.neighbours().front().message != report.message)
+    const auto isReported = [&report](const Neighbour& each) { return each.message == report.message; };
+    if (level && level->message != report.message &&
+        std::none_of(picture.neighbours().begin(), picture.neighbours().end(), isReported))
         return;
     _next.clear();
     if (level) {
@@ -69,7 +73,7 @@ void ReselectionsDetector::compare(const MessageReport& report, const RadioPictu
             Seen seen{neighbour, *neighbour.level_dBm - level->number, std::nullopt, {}};
             if (seen.margin_dB >= lateMargin_dB) {
                 const auto known = std::find_if(_seen.begin(), _seen.end(), [&neighbour](const Seen& each) {
-                    return isSameCell(each.cell, neighbour);
+                    return isCell(each.cell, identityOf(neighbour));
                 });
                 const bool wasBetter = known != _seen.end() && known->betterSince;
                 seen.betterSince = wasBetter ? known->betterSince : report.time;
@@ -87,7 +91,7 @@ void ReselectionsDetector::confirm(const MessageReport& report, const RadioPictu
     const Reading* const level = picture.find(Role::ServingLevel);
     for (const Neighbour& each : picture.neighbours()) {
         if (!level || level->time < changed || each.time < changed || !each.level_dBm ||
-            areSameCell(identityOf(each), _early->from) != true)
+            !isCell(each, _early->from))
             continue;
         if (*each.level_dBm >= level->number) {
             addEvidence(_early->event, each.message);
@@ -105,7 +109,7 @@ void ReselectionsDetector::judge(const MessageReport& report, const RadioPicture
     if (change.isMovedByNetwork != false || change.from.technology != change.to.technology)
         return;
     for (const Seen& each : _seen) {
-        if (areSameCell(identityOf(each.cell), change.to) != true || report.time - each.cell.time > oldest)
+        if (!isCell(each.cell, change.to) || report.time - each.cell.time > oldest)
             continue;
         const bool isLate = each.betterSince && report.time - *each.betterSince > lateTime;
         if (!isLate && each.margin_dB > 0)

@@ -102,8 +102,8 @@ void PositionedReader::addLosses() {
         _lostBytes += loss.bytes;
         addLoss(std::move(loss));
     }
-    for (; _comments < _reader.comments().first().size(); ++_comments)
-        addComment(_reader.comments().first()[_comments]);
+    for (Comment& comment : _reader.takeNewComments())
+        addComment(std::move(comment));
 }
 
 } // namespace velmora

@@ -65,7 +65,6 @@ private:
     bool _isAtEnd = false;
     std::uint64_t _losses = 0; ///< so many of the reader's have been added
     std::uint64_t _lostBytes = 0;
-    std::size_t _comments = 0;
 };
 
 } // namespace velmora

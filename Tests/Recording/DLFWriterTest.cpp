@@ -16,6 +16,7 @@
 #include <iterator>
 #include <memory>
 #include <string>
+#include <utility>
 #include <vector>
 
 #include <gmock/gmock.h>
@@ -155,6 +156,24 @@ TEST_F(DLFWriterTest, recordsWhosePayloadResemblesARecordAreReadAgain) {
             ASSERT_EQ(out.messages.size(), 1U) << payload << ", " << code;
             EXPECT_TRUE(out.messages[0].ends_with(": " + hexText(message.bytes()))) << out.messages[0];
         }
+}
+
+TEST_F(DLFWriterTest, payloadsThatSupportEachOtherAsRecordsAreReadAgain) {
+    // With the last byte of the time stamp, 01, before it each of these payloads is a record of 256 bytes
+    // whose time is in the year 2111, and the one ends where the other begins.
+    const char* const payload = "00010000 0000000000000303";
+    const auto writer = make();
+    std::string between;
+    for (int i = 0; i < 256 + 1 - 24 - 12; ++i)
+        between += "00";
+    const std::vector<std::pair<std::uint16_t, std::string>> records{
+        {4, payload}, {2, between}, {5, payload}};
+    for (const auto& [code, bytes] : records)
+        ASSERT_TRUE(writer->append(stampedRecord(code, bytes, stampAfter(0), 0xFF).bytes()));
+    ASSERT_TRUE(writer->close());
+    const ReadOut out = readAnyForm(Data::copyOf(_medium.content));
+    EXPECT_THAT(out.losses, IsEmpty());
+    EXPECT_EQ(out.messages.size(), 3U);
 }
 
 TEST_F(DLFWriterTest, repeatsAFailure) {

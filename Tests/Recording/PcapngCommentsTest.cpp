@@ -83,5 +83,21 @@ TEST(PcapngComments, areKeptUpToABoundAndCounted) {
     EXPECT_EQ(comments.first().back().text.size(), Comments::maximumLength);
 }
 
+TEST(PcapngComments, canBeTakenBeyondThatBound) {
+    Comments comments;
+    for (std::size_t i = 0; i < Comments::maximumKept; ++i)
+        comments.add({Comment::About::Message, i, 0, "early"});
+    EXPECT_EQ(comments.takeNew().size(), Comments::maximumKept);
+    EXPECT_TRUE(comments.takeNew().empty());
+    comments.add({Comment::About::Message, 7, 0, std::string(Comments::maximumLength + 1, 'x')});
+    const std::vector<Comment> late = comments.takeNew();
+    ASSERT_EQ(late.size(), 1U);
+    EXPECT_EQ(late[0].number, 7U);
+    EXPECT_EQ(late[0].text.size(), Comments::maximumLength);
+    for (std::size_t i = 0; i < 2 * Comments::maximumKept; ++i)
+        comments.add({Comment::About::Message, i, 0, ""});
+    EXPECT_EQ(comments.takeNew().size(), Comments::maximumKept);
+}
+
 } // namespace
 } // namespace velmora

@@ -65,17 +65,14 @@ void FileMessages::take(const LoggedMessage& message) {
     }
     if (const std::optional<std::string> reason = technology.feed->decode(message, _file.input))
         _undecoded.add(message, *reason);
-    if (_reader.comments().count() != _comments)
-        reportNewNotes(*technology.feed);
+    reportNewNotes(*technology.feed);
 }
 
-/// Those on the latest message. Of a file with more comments than are kept, the first are notes.
+/// Those on the latest message.
 void FileMessages::reportNewNotes(TechnologyFeed& feed) {
-    const std::vector<Comment>& kept = _reader.comments().first();
-    for (; _comments < kept.size(); ++_comments)
-        if (const Comment& comment = kept[_comments]; comment.about == Comment::About::Message)
+    for (const Comment& comment : _reader.takeNewComments())
+        if (comment.about == Comment::About::Message)
             feed.analysis().reportNote({{_file.input, comment.number}, comment.text});
-    _comments = _reader.comments().count();
 }
 
 FileMessages::Technology& FileMessages::at(std::uint32_t index) {

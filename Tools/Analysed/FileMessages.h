@@ -59,8 +59,7 @@ private:
     TechnologyChoice _choice;
     std::vector<std::string> _known; ///< the file's technologies, where they are known beforehand
     std::vector<Technology> _technologies;
-    std::uint64_t _losses = 0;   ///< that have been reported
-    std::uint64_t _comments = 0; ///< that have been reported, or are none on messages
+    std::uint64_t _losses = 0; ///< that have been reported
     UndecodedMessages _undecoded;
 };
 

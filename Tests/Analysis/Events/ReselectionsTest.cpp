@@ -97,6 +97,43 @@ TEST(Reselections, AreNotEarlyWithoutAReportAfterwards) {
     EXPECT_THAT(lte.linesOf("early-reselection"), IsEmpty());
 }
 
+TEST(Reselections, OfGSMAreLateThoughSomeReportsHaveNoBSIC) {
+    constexpr std::string_view list = "/GSM/Neighboring Cells";
+    HandMadeEngine gsm("Ostrel_GSM", {{"/GSM/GSM Serving Cell/ARFCN", Role::ServingChannel},
+                                      {"/GSM/GSM Serving Cell/RSSI", Role::ServingLevel},
+                                      {"/GSM/Neighboring Cells/*/ARFCN", Role::NeighbourChannel},
+                                      {"/GSM/Neighboring Cells/*/BSIC", Role::NeighbourPhysicalCell},
+                                      {"/GSM/Neighboring Cells/*/RSSI", Role::NeighbourLevel}});
+    for (int second = 0; second <= 12; ++second) {
+        HandMadeMessage message = gsm.at(second);
+        message.state("/GSM/GSM RR Info/RR State", 5)
+            .number("/GSM/GSM Serving Cell/ARFCN", 20)
+            .number("/GSM/GSM Serving Cell/RSSI", -90)
+            .list(list, 1)
+            .row(0)
+            .number("/GSM/Neighboring Cells/*/ARFCN", 30)
+            .number("/GSM/Neighboring Cells/*/RSSI", -80);
+        if (second % 3 != 0)
+            message.number("/GSM/Neighboring Cells/*/BSIC", 12);
+        gsm.send(message);
+    }
+    gsm.send(gsm.at(12.5).number("/GSM/GSM Serving Cell/ARFCN", 30));
+    EXPECT_THAT(gsm.linesOf("late-reselection"),
+                ElementsAre("12.500 ARFCN 20 to ARFCN 30, 10.0 dB stronger"));
+}
+
+TEST(Reselections, AreComparedWithEachReportOfTheirCarrier) {
+    LTEEngine lte;
+    for (double seconds = 0; seconds <= 11; ++seconds) {
+        lte.measureNeighbours(seconds, {{40, -50}}, 6300); // the strongest one is of another carrier
+        lte.measureIdle(seconds + 0.1, 17, -90);
+        lte.measureNeighbours(seconds + 0.2, {{18, seconds < 1 ? -92 : -84}});
+    }
+    // 10.1 s after the report of second 1, and 9.2 s after the next of the serving cell.
+    lte.measureIdle(11.3, 18, -84);
+    EXPECT_DOUBLE_EQ(numberOf(lte.only("late-reselection"), "duration"), 10.1);
+}
+
 TEST(Reselections, ByTheNetworkAreNotJudged) {
     LTEEngine lte;
     measure(lte, 20, -60);

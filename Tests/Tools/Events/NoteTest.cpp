@@ -1,6 +1,7 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
+#include "Recording/Comments.h"
 #include "Recording/Pcapng/PcapngWriter.h"
 #include "Tests/Tools/Events/EventsFixture.h"
 
@@ -50,6 +51,17 @@ TEST_F(NoteTest, CommentsOnMessagesAreEvents) {
     EXPECT_EQ(events.at(0).at("time"), "2026-11-16T05:00:01.500000000Z");
     // As a line of text, nothing of a note moves the cursor.
     EXPECT_THAT(run({"events", "--kind", "note", path("noted.pcapng")}), HasSubstr("door\\nopens"));
+}
+
+TEST_F(NoteTest, AreAllListedOfAFileWithMoreThanReadersKeep) {
+    constexpr std::size_t many = Comments::maximumKept + 3;
+    const auto writer = PcapngWriter::create(path("many.pcapng"), "Ostrel_GSM");
+    for (std::size_t i = 1; i <= many; ++i)
+        add(**writer, static_cast<std::int64_t>(i) * 100, {"note " + std::to_string(i)});
+    EXPECT_TRUE((*writer)->close());
+    const std::vector<std::string> found = notes("many.pcapng");
+    ASSERT_EQ(found.size(), many);
+    EXPECT_EQ(found.back(), "103: note 103");
 }
 
 TEST_F(NoteTest, AreKeptByConvertListedByInfoAndRemovedByMask) {
