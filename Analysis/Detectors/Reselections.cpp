@@ -65,7 +65,7 @@ void ReselectionsDetector::compare(const MessageReport& report, const RadioPictu
         return;
     _next.clear();
     if (level) {
-        const CellIdentity serving = picture.serving();
+        const CellIdentity serving = picture.servingCell();
         for (const Neighbour& neighbour : picture.neighbours()) {
             if (!areComparable(neighbour, serving) || report.time - neighbour.time > oldest ||
                 report.time - level->time > oldest)

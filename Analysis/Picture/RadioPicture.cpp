@@ -258,7 +258,7 @@ std::optional<RadioMode> RadioPicture::mode() const {
 }
 
 CellIdentity RadioPicture::serving() const {
-    CellIdentity cell = identity(_current);
+    CellIdentity cell = servingCell();
     cell.area = numberOf(find(Role::ServingArea));
     const Reading* const country = find(Role::ServingCountryCode);
     const Reading* const network = find(Role::ServingNetworkCode);

@@ -55,6 +55,8 @@ public:
     [[nodiscard]] std::optional<RadioTechnology> technology() const { return _technology; }
     [[nodiscard]] std::optional<RadioMode> mode() const;
     [[nodiscard]] CellIdentity serving() const;
+    /// The same without its network and area.
+    [[nodiscard]] CellIdentity servingCell() const { return identity(_current); }
     /// Set where the latest message reported another serving cell; null otherwise.
     [[nodiscard]] const ServingChange* servingChange() const { return _change ? &*_change : nullptr; }
     /// Whether the phone has serving cells of several radio technologies at the same time.

@@ -8,12 +8,9 @@
 
 namespace velmora {
 
-bool CountedLeaf::counts(const Observation& observation) const {
-    if (!isChosen || observation.kind == ObservedKind::Binary ||
-        (observation.kind == ObservedKind::Text && observation.leaf->identity != Identity::None))
-        return false;
-    return rows.empty() || std::any_of(rows.begin(), rows.end(),
-                                       [&](const auto& each) { return isInRows(observation, each); });
+bool CountedLeaf::isInRows(const Observation& observation) const {
+    return std::any_of(rows.begin(), rows.end(),
+                       [&](const auto& each) { return velmora::isInRows(observation, each); });
 }
 
 CountedLeaf& CountedLeaves::make(const CatalogueField& leaf) {
@@ -25,6 +22,7 @@ CountedLeaf& CountedLeaves::make(const CatalogueField& leaf) {
     if (!chosen)
         return use;
     use.isChosen = true;
+    use.isIdentifying = leaf.identity != Identity::None;
     use.name = std::move(chosen->name);
     use.rows = std::move(chosen->rows);
     use.measure = WorstMinute::measureOf(leaf.role);

@@ -16,6 +16,7 @@ namespace velmora {
 struct CountedLeaf {
     bool isKnown = false;
     bool isChosen = false;
+    bool isIdentifying = false;           ///< its texts are of an identity
     LeafStatistics* statistics = nullptr; ///< in the current part, once they have been looked up
     std::string name;                     ///< as the choice names it
     std::vector<PathPattern::Rows> rows;  ///< in any of which they must be; empty for all
@@ -23,7 +24,15 @@ struct CountedLeaf {
 
     /// Whether the observation is chosen and can be counted: bytes cannot, and neither can texts that
     /// identify someone or something.
-    [[nodiscard]] bool counts(const Observation& observation) const;
+    [[nodiscard]] bool counts(const Observation& observation) const {
+        if (!isChosen || observation.kind == ObservedKind::Binary ||
+            (isIdentifying && observation.kind == ObservedKind::Text))
+            return false;
+        return rows.empty() || isInRows(observation);
+    }
+
+private:
+    [[nodiscard]] bool isInRows(const Observation& observation) const;
 };
 
 /// How the leaves of a technology are counted, by a choice that is looked at once a leaf.

@@ -41,7 +41,7 @@ void HeldStates::report(const Observation& observation, StateCounts* counts, Tim
 }
 
 void HeldStates::withdraw(const CatalogueField& leaf, Time time) {
-    if (leaf.index >= _held.size() || !_held[leaf.index])
+    if (!holds(leaf))
         return;
     countTime(*_held[leaf.index], time);
     _held[leaf.index].reset();

@@ -22,6 +22,10 @@ public:
     /// The leaf, whose statistics these are in the current part (null: none), reported that value at that
     /// time.
     void report(const Observation& observation, StateCounts* counts, Time time);
+    /// Whether a state of the leaf holds.
+    [[nodiscard]] bool holds(const CatalogueField& leaf) const {
+        return leaf.index < _held.size() && _held[leaf.index];
+    }
     /// The leaf has no value any more.
     void withdraw(const CatalogueField& leaf, Time time);
     /// Up to that time what holds is counted in the earlier part, from then on in another one, where

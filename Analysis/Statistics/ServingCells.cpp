@@ -28,9 +28,9 @@ void learn(CellIdentity& known, const CellIdentity& cell) {
 } // namespace
 
 std::uint32_t ServingCells::numberOf(const RadioPicture& picture) {
-    const CellIdentity cell = picture.serving();
-    if (areEqual(cell, _latest) && !picture.servingChange())
+    if (areEqual(picture.servingCell(), _latest) && !picture.servingChange())
         return _number;
+    const CellIdentity cell = picture.serving();
     _latest = cell;
     if (!cell.isKnown())
         return _number = unknown;

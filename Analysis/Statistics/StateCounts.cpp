@@ -8,9 +8,11 @@
 namespace velmora {
 
 std::size_t StateCounts::indexOf(const Observation& observation, ObservedText& texts) {
+    if (_latest < _values.size() && _values[_latest].key.is(observation)) // as most are
+        return _latest;
     for (std::size_t i = 0; i < _values.size(); ++i)
         if (_values[i].key.is(observation))
-            return i;
+            return _latest = i;
     if (_values.size() == most)
         return others;
     return add(observation.kind == ObservedKind::Text

@@ -76,6 +76,7 @@ private:
     std::vector<Value> _values;
     Value _others;
     Transitions _transitions;
+    std::size_t _latest = 0; ///< the index of the latest observation's value, if that is kept
 };
 
 } // namespace velmora

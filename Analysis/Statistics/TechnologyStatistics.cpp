@@ -131,11 +131,11 @@ void TechnologyStatistics::enter(Time time) {
         name(*earlier);
     if (_part && !_groups.plan().leaves.isEverything())
         for (const CatalogueField& leaf : _catalogue.fields())
-            if (_leaves.of(leaf).isChosen)
-                static_cast<void>(statisticsOf(leaf));
+            if (CountedLeaf& use = _leaves.of(leaf); use.isChosen)
+                static_cast<void>(statisticsOf(leaf, use));
     _held.moveTo(
         [this](const CatalogueField& leaf) {
-            LeafStatistics* const statistics = statisticsOf(leaf);
+            LeafStatistics* const statistics = statisticsOf(leaf, _leaves.of(leaf));
             return statistics ? &statistics->states : nullptr;
         },
         time);
@@ -158,24 +158,25 @@ GroupKey TechnologyStatistics::keyOf(const Place& place) const {
 
 void TechnologyStatistics::observe(const Observation& observation, Time time) {
     const CatalogueField& leaf = *observation.leaf;
-    const CountedLeaf& use = _leaves.of(leaf);
+    CountedLeaf& use = _leaves.of(leaf);
     if (!use.counts(observation))
         return;
-    LeafStatistics* const statistics = statisticsOf(leaf);
+    LeafStatistics* const statistics = statisticsOf(leaf, use);
     if (_part && !statistics)
         ++_part->omitted;
     const bool isInList = !observation.rows.empty();
     const bool isNumber = observation.kind == ObservedKind::Number;
-    if (!isInList && (isNumber || observation.kind == ObservedKind::Absent))
+    if (!isInList && (isNumber || observation.kind == ObservedKind::Absent) && _held.holds(leaf))
         _held.withdraw(leaf, time);
-    if (observation.kind == ObservedKind::Absent) {
+    if (isNumber) {
+        if (!statistics)
+            return;
+        statistics->numbers.add(observation.number);
+        if (use.measure && !has(StatisticsPlan::By::Minute))
+            minutesOf(leaf.role, *use.measure).add(time, observation.number);
+    } else if (observation.kind == ObservedKind::Absent) {
         if (statistics)
             ++statistics->absent;
-    } else if (isNumber) {
-        if (statistics)
-            statistics->numbers.add(observation.number);
-        if (statistics && use.measure && !has(StatisticsPlan::By::Minute))
-            minutesOf(leaf.role, *use.measure).add(time, observation.number);
     } else if (!isInList) {
         _held.report(observation, statistics ? &statistics->states : nullptr, time);
     } else if (statistics) {

@@ -63,8 +63,7 @@ private:
     /// What follows, from that time on, belongs to the group of this time, file and cell.
     void enter(Time time);
     void observe(const Observation& observation, Time time);
-    [[nodiscard]] LeafStatistics* statisticsOf(const CatalogueField& leaf) {
-        CountedLeaf& use = _leaves.of(leaf);
+    [[nodiscard]] LeafStatistics* statisticsOf(const CatalogueField& leaf, CountedLeaf& use) {
         if (!use.statistics && _part)
             use.statistics = _groups.of(*_part, leaf, use.name);
         return use.statistics;

@@ -18,10 +18,6 @@ constexpr std::size_t smallestTable = 8;
 
 } // namespace
 
-std::uint64_t ValueCounts::keyOf(double value) {
-    return std::bit_cast<std::uint64_t>(value + 0.0); // -0 is 0
-}
-
 /// The middle of those that the key stands for.
 double ValueCounts::valueOf(std::uint64_t key) const {
     const bool isZero = key << 1 == 0;
@@ -33,11 +29,8 @@ double ValueCounts::valueOf(std::uint64_t key) const {
 }
 
 std::size_t ValueCounts::slotOf(std::uint64_t key) const {
-    constexpr std::uint64_t spread = 0x9E3779B97F4A7C15; // 2^64 divided by the golden ratio
-    // The leading bits of the product: the keys of quarters differ in their leading bits alone.
-    const int shift = std::countl_zero(_slots.size()) + 1;
     const std::size_t mask = _slots.size() - 1;
-    auto slot = static_cast<std::size_t>(key * spread >> shift);
+    std::size_t slot = homeOf(key);
     while (_slots[slot].count != 0 && _slots[slot].key != key)
         slot = (slot + 1) & mask;
     return slot;
@@ -52,8 +45,7 @@ void ValueCounts::addKey(double value, std::uint64_t key) {
 void ValueCounts::insert(std::uint64_t key, std::uint64_t count) {
     if (2 * (_used + 1) > _slots.size())
         rehash(std::max(smallestTable, 2 * _slots.size()));
-    _latest = slotOf(key);
-    Slot& slot = _slots[_latest];
+    Slot& slot = _slots[slotOf(key)];
     if (slot.count == 0) {
         slot.key = key;
         ++_used;
@@ -66,6 +58,7 @@ void ValueCounts::insert(std::uint64_t key, std::uint64_t count) {
 void ValueCounts::rehash(std::size_t capacity) {
     std::vector<Slot> earlier(capacity);
     earlier.swap(_slots);
+    _shift = std::countl_zero(capacity) + 1;
     _used = 0;
     for (const Slot& each : earlier)
         if (each.count != 0) {
@@ -74,7 +67,6 @@ void ValueCounts::rehash(std::size_t capacity) {
             slot.key = coarse(each.key);
             slot.count += each.count;
         }
-    _latest = _slots.size();
 }
 
 void ValueCounts::coarsen() {

@@ -5,6 +5,7 @@
 
 #include "Analysis/Statistics/ExactSum.h"
 
+#include <bit>
 #include <cstddef>
 #include <cstdint>
 #include <optional>
@@ -31,10 +32,13 @@ public:
         _minimum = _count == 1 || value < _minimum ? value : _minimum;
         _maximum = _count == 1 || value > _maximum ? value : _maximum;
         const std::uint64_t key = keyOf(value);
-        if (_coarseness == 0 && _latest < _slots.size() && _slots[_latest].key == key)
-            ++_slots[_latest].count;
-        else
-            addKey(value, key);
+        // There are millions of values, nearly all of which are where they belong.
+        if (_coarseness == 0 && !_slots.empty())
+            if (Slot& slot = _slots[homeOf(key)]; slot.key == key && slot.count != 0) {
+                ++slot.count;
+                return;
+            }
+        addKey(value, key);
     }
     void add(const ValueCounts& other);
 
@@ -61,9 +65,16 @@ private:
         std::uint64_t count = 0; ///< 0 for a free one
     };
 
-    [[nodiscard]] static std::uint64_t keyOf(double value);
+    [[nodiscard]] static std::uint64_t keyOf(double value) {
+        return std::bit_cast<std::uint64_t>(value + 0.0); // -0 is 0
+    }
     [[nodiscard]] double valueOf(std::uint64_t key) const;
     [[nodiscard]] std::uint64_t coarse(std::uint64_t key) const { return key >> _coarseness << _coarseness; }
+    [[nodiscard]] std::size_t homeOf(std::uint64_t key) const {
+        constexpr std::uint64_t spread = 0x9E3779B97F4A7C15; // 2^64 divided by the golden ratio
+        // The leading bits of the product: the keys of quarters differ in their leading bits alone.
+        return static_cast<std::size_t>(key * spread >> _shift);
+    }
     [[nodiscard]] std::size_t slotOf(std::uint64_t key) const;
     void addKey(double value, std::uint64_t key);
     void insert(std::uint64_t key, std::uint64_t count);
@@ -77,7 +88,7 @@ private:
     unsigned _coarseness = 0;   ///< how many trailing binary digits are dropped
     std::vector<Slot> _slots;   ///< a hash table; its size is 0 or a power of two
     std::size_t _used = 0;      ///< slots
-    std::size_t _latest = 0;    ///< the slot of the latest value
+    int _shift = 0;             ///< what is left of 64 bits is a slot
     std::vector<ExactSum> _sum; ///< of the exact values, once slots are rounded; else empty
 };
 

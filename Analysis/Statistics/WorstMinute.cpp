@@ -34,8 +34,9 @@ std::optional<WorstMinute::Minute> WorstMinute::worst() const {
     return worse(_measure, _worst, Minute{_minute, *figure, _values.count()});
 }
 
-void WorstMinute::endMinute() {
+void WorstMinute::beginMinute(Time minute) {
     _worst = worst();
+    _minute = minute;
     _values = ValueCounts(mostValues);
 }
 

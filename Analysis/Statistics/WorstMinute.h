@@ -8,6 +8,7 @@
 #include "LogGenerator/Fields/Role.h"
 #include "Platform/Clock.h"
 
+#include <chrono>
 #include <cstddef>
 #include <cstdint>
 #include <optional>
@@ -31,11 +32,9 @@ public:
     explicit WorstMinute(Measure measure) : _measure(measure) {}
 
     void add(Time time, double value) {
-        const Time minute = minuteOf(time);
-        if (minute != _minute) {
-            endMinute();
-            _minute = minute;
-        }
+        // Without a division for most values.
+        if (time < _minute || durationBetween(_minute, time) >= std::chrono::minutes(1))
+            beginMinute(minuteOf(time));
         _values.add(value);
     }
 
@@ -54,10 +53,10 @@ public:
 private:
     static constexpr std::size_t mostValues = 512;
 
-    void endMinute();
+    void beginMinute(Time minute);
 
     Measure _measure;
-    Time _minute{};
+    Time _minute{};                  ///< its begin
     ValueCounts _values{mostValues}; ///< of the latest minute
     std::optional<Minute> _worst;    ///< of the earlier ones
 };

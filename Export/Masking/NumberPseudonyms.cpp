@@ -11,6 +11,12 @@ namespace {
 
 constexpr unsigned mostBits = 48;
 
+/// Of numbers of so many bits, up to `mostBits`, or of so many decimal digits.
+std::uint64_t cacheKey(PseudonymKind kind, std::uint64_t value, unsigned size) {
+    return value | std::uint64_t{size} << 48 | std::uint64_t{static_cast<std::uint8_t>(kind)} << 56;
+}
+constexpr unsigned decimalDigits = mostBits + 1; ///< added to their number
+
 std::uint64_t allOnes(unsigned bits) {
     return (std::uint64_t{1} << bits) - 1;
 }
@@ -18,8 +24,7 @@ std::uint64_t allOnes(unsigned bits) {
 } // namespace
 
 std::uint64_t NumberPseudonyms::permuted(PseudonymKind kind, std::uint64_t value, unsigned bits) {
-    const std::uint64_t key =
-        value | std::uint64_t{bits} << 48 | std::uint64_t{static_cast<std::uint8_t>(kind)} << 56;
+    const std::uint64_t key = cacheKey(kind, value, bits);
     if (const auto cached = _cache.find(key); cached != _cache.end())
         return cached->second;
     std::array<std::uint8_t, mostBits> digits{};
@@ -29,10 +34,14 @@ std::uint64_t NumberPseudonyms::permuted(PseudonymKind kind, std::uint64_t value
     std::uint64_t result = 0;
     for (unsigned i = 0; i < bits; ++i)
         result |= std::uint64_t{digits[i]} << i;
+    keep(key, result);
+    return result;
+}
+
+void NumberPseudonyms::keep(std::uint64_t key, std::uint64_t pseudonym) {
     if (_cache.size() >= mostCached)
         _cache.clear();
-    _cache.emplace(key, result);
-    return result;
+    _cache.emplace(key, pseudonym);
 }
 
 std::uint64_t NumberPseudonyms::number(PseudonymKind kind, std::uint64_t value, unsigned bits,
@@ -90,6 +99,9 @@ std::uint64_t NumberPseudonyms::cell(CellIdentityForm form, std::uint64_t value,
 }
 
 unsigned NumberPseudonyms::decimal(PseudonymKind kind, unsigned code, unsigned count) {
+    const std::uint64_t key = cacheKey(kind, code, decimalDigits + count);
+    if (const auto cached = _cache.find(key); cached != _cache.end())
+        return static_cast<unsigned>(cached->second);
     std::array<std::uint8_t, 3> digits{};
     for (unsigned i = 0; i < count; ++i, code /= 10)
         digits[count - 1 - i] = static_cast<std::uint8_t>(code % 10);
@@ -97,6 +109,7 @@ unsigned NumberPseudonyms::decimal(PseudonymKind kind, unsigned code, unsigned c
     unsigned result = 0;
     for (unsigned i = 0; i < count; ++i)
         result = result * 10 + digits[i];
+    keep(key, result);
     return result;
 }
 

@@ -42,6 +42,7 @@ private:
     /// The kind's permutation of the numbers of that many bits, without the caller's exceptions.
     [[nodiscard]] std::uint64_t permuted(PseudonymKind kind, std::uint64_t value, unsigned bits);
     [[nodiscard]] unsigned decimal(PseudonymKind kind, unsigned code, unsigned digits);
+    void keep(std::uint64_t key, std::uint64_t pseudonym);
 
     static constexpr std::size_t mostCached = std::size_t{1} << 16;
 

@@ -3,6 +3,7 @@
 
 #include "LogGenerator/Observations/FieldMap.h"
 
+#include "LogGenerator/Observations/PhysicalValue.h"
 #include "LogGenerator/Observations/WantedLeaves.h"
 
 #include <algorithm>
@@ -20,6 +21,24 @@ bool isBefore(const FieldMap::Entry& a, const List* list, const Field* field) {
 /// Whether the telephony service may supply a dictionary or an array, whose leaves messages name.
 bool mayBeTree(const Field& field) {
     return field.place.isComputed() && field.format.kind == TextFormat::Kind::Text;
+}
+
+FieldMap::TableEntry tableEntry(const FieldMap::Entry& entry) {
+    const Field& field = *entry.field;
+    const std::optional<ShownLine> line =
+        entry.kind == ObservedKind::Number ? shownLine(field) : std::nullopt;
+    return {field.place,
+            field.format.hasSpecial,
+            entry.kind,
+            line.has_value(),
+            field.format.specialValue,
+            line ? line->scale : 0,
+            line ? line->offset : 0,
+            entry.scale,
+            entry.offset,
+            entry.node->leaf(),
+            entry.source,
+            entry.field};
 }
 
 } // namespace
@@ -74,13 +93,13 @@ std::span<const FieldMap::Entry> FieldMap::find(const List* list, const Field& f
     return {_wanted.data() + first, end - first};
 }
 
-std::span<const FieldMap::Entry> FieldMap::addTable(const List* list, const Layout& layout,
-                                                    std::uint32_t code) const {
+std::span<const FieldMap::TableEntry> FieldMap::addTable(const List* list, const Layout& layout,
+                                                         std::uint32_t code) const {
     Table& table = _tables.emplace_back(Table{list, layout.fields, code, {}});
     for (const Field& field : layout.fields)
         for (const Entry& entry : find(list, field))
             if (entry.source->code == code)
-                table.entries.push_back(entry);
+                table.entries.push_back(tableEntry(entry));
     return table.entries;
 }
 

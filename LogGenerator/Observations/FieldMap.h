@@ -31,6 +31,21 @@ public:
         double scale; ///< physical value = shown value * scale + offset
         double offset;
     };
+    /// What is read of a record by a table: the same of one of its fields, once for all records.
+    struct TableEntry {
+        Place place;
+        bool hasSpecial;
+        ObservedKind kind;
+        bool isLine; ///< the shown value is the raw one times `shownScale` plus `shownOffset`
+        std::int64_t specialValue;
+        double shownScale;
+        double shownOffset;
+        double scale;
+        double offset;
+        const CatalogueField* leaf;
+        const CatalogueSource* source;
+        const Field* field;
+    };
     /// A list and a place that shows it.
     struct ListEntry {
         const List* outer;
@@ -71,8 +86,8 @@ public:
     [[nodiscard]] std::span<const Entry> find(const List* list, const Field& field) const;
     /// The same for all fields of a table, in its order, as far as records of that code show them. They are
     /// looked up once.
-    [[nodiscard]] std::span<const Entry> findAll(const List* list, const Layout& layout,
-                                                 std::uint32_t code) const {
+    [[nodiscard]] std::span<const TableEntry> findAll(const List* list, const Layout& layout,
+                                                      std::uint32_t code) const {
         for (const Table& table : _tables)
             if (table.fields.data() == layout.fields.data() && table.list == list && table.code == code &&
                 table.fields.size() == layout.fields.size())
@@ -89,10 +104,10 @@ private:
         const List* list;
         std::span<const Field> fields;
         std::uint32_t code;
-        std::vector<Entry> entries;
+        std::vector<TableEntry> entries;
     };
     [[nodiscard]] std::vector<std::uint32_t> wantedCodes() const;
-    std::span<const Entry> addTable(const List* list, const Layout& layout, std::uint32_t code) const;
+    std::span<const TableEntry> addTable(const List* list, const Layout& layout, std::uint32_t code) const;
 
     Catalogue* _catalogue = nullptr;
     std::string _section;

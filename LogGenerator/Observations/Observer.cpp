@@ -43,22 +43,26 @@ ObservedMessage Observer::message(Time arrival, std::optional<std::uint32_t> cod
     return {_messages, arrival, code, timestamp, _observations, _lists, _removed, _damage};
 }
 
-Observation& Observer::add(const CatalogueField& leaf, const CatalogueSource* source) {
-    Observation& observation = _observations.emplace_back();
-    observation.leaf = &leaf;
-    observation.source = source;
-    observation.rows = _row;
-    if (!_levels.empty())
-        observation.rowKey = _levels.back().numberKey;
-    return observation;
-}
-
 template <class Observe>
 void Observer::forEachLeaf(const Field& field, Observe observe) {
     beginValue();
     for (const FieldMap::Entry& entry : _map->find(currentList(), field))
         if (entry.source->code == _code && _wanted.has(*entry.node->leaf()))
             observe(entry, add(*entry.node->leaf(), entry.source));
+}
+
+template <class Entry>
+void Observer::setNumber(const Entry& entry, std::int64_t raw, Observation& observation) {
+    const Field& field = *entry.field;
+    observation.text = Observation::Text::OfRaw;
+    observation.raw = raw;
+    if (field.format.hasSpecial && raw == field.format.specialValue)
+        return; // absent
+    observation.kind = entry.kind;
+    if (entry.kind == ObservedKind::Number)
+        observation.number = shownNumber(field, raw) * entry.scale + entry.offset;
+    else if (entry.kind == ObservedKind::Text)
+        setCode(field, codeText(field, raw, _texts), observation);
 }
 
 void Observer::fields(const Record& record, const Layout& layout) {
@@ -71,14 +75,27 @@ void Observer::fields(const Record& record, const Layout& layout) {
     tableFields(_map->findAll(list, layout, _code), record);
 }
 
-void Observer::tableFields(std::span<const FieldMap::Entry> entries, const Record& record) {
-    for (const FieldMap::Entry& entry : entries)
-        setNumber(entry, entry.field->place.read(record), add(*entry.node->leaf(), entry.source));
+void Observer::tableFields(std::span<const FieldMap::TableEntry> entries, const Record& record) {
+    for (const FieldMap::TableEntry& entry : entries) {
+        const std::int64_t raw = entry.place.read(record);
+        Observation& observation = add(*entry.leaf, entry.source);
+        if (!entry.isLine) {
+            setNumber(entry, raw, observation);
+            continue;
+        }
+        observation.text = Observation::Text::OfRaw;
+        observation.raw = raw;
+        if (entry.hasSpecial && raw == entry.specialValue)
+            continue; // absent
+        observation.kind = ObservedKind::Number;
+        observation.number =
+            (static_cast<double>(raw) * entry.shownScale + entry.shownOffset) * entry.scale + entry.offset;
+    }
 }
 
 void Observer::rows(const List& list, const CountedList& entries, const Layout& layout) {
     beginList(list);
-    const std::span<const FieldMap::Entry> found = _map->findAll(&list, layout, _code);
+    const std::span<const FieldMap::TableEntry> found = _map->findAll(&list, layout, _code);
     const std::size_t count = entries.completeCount();
     for (std::size_t i = 0; i < count && !found.empty(); ++i) {
         beginRow();
@@ -93,19 +110,6 @@ void Observer::number(const Field& field, std::int64_t raw) {
     forEachLeaf(field, [&](const FieldMap::Entry& entry, Observation& observation) {
         setNumber(entry, raw, observation);
     });
-}
-
-void Observer::setNumber(const FieldMap::Entry& entry, std::int64_t raw, Observation& observation) {
-    const Field& field = *entry.field;
-    observation.text = Observation::Text::OfRaw;
-    observation.raw = raw;
-    if (field.format.hasSpecial && raw == field.format.specialValue)
-        return; // absent
-    observation.kind = entry.kind;
-    if (entry.kind == ObservedKind::Number)
-        observation.number = shownNumber(field, raw) * entry.scale + entry.offset;
-    else if (entry.kind == ObservedKind::Text)
-        setCode(field, codeText(field, raw, _texts), observation);
 }
 
 void Observer::real(const Field& field, double value) {

@@ -83,9 +83,19 @@ private:
     template <class Observe>
     void forEachLeaf(const Field& field, Observe observe);
     /// The fields of a table by what the map has found of them.
-    void tableFields(std::span<const FieldMap::Entry> entries, const Record& record);
-    void setNumber(const FieldMap::Entry& entry, std::int64_t raw, Observation& observation);
-    Observation& add(const CatalogueField& leaf, const CatalogueSource* source);
+    void tableFields(std::span<const FieldMap::TableEntry> entries, const Record& record);
+    /// `Entry` is one of either kind of the map.
+    template <class Entry>
+    void setNumber(const Entry& entry, std::int64_t raw, Observation& observation);
+    Observation& add(const CatalogueField& leaf, const CatalogueSource* source) {
+        Observation& observation = _observations.emplace_back();
+        observation.leaf = &leaf;
+        observation.source = source;
+        observation.rows = _row;
+        if (!_levels.empty())
+            observation.rowKey = _levels.back().numberKey;
+        return observation;
+    }
     /// Sets what identifies the row of the observations from `first` on, by the leaves of these names.
     void setKey(std::size_t first, std::span<const std::string_view> names);
     /// The leaves at the node and below it that none of the observations from that one on is of show nothing

@@ -65,6 +65,25 @@ double shownNumber(const Field& field, std::int64_t raw) {
     }
 }
 
+std::optional<ShownLine> shownLine(const Field& field) {
+    const TextFormat& format = field.format;
+    if (field.means.sign != Sign::AsShown || field.place.isComputed())
+        return std::nullopt;
+    if (format.kind == TextFormat::Kind::Real)
+        return ShownLine{format.scale, format.offset};
+    if (format.kind != TextFormat::Kind::Integer)
+        return std::nullopt;
+    // The ends of the line have to fit into what is shown; all are whole numbers, which are exact.
+    const ShownLine line{static_cast<double>(static_cast<std::int64_t>(format.scale)),
+                         static_cast<double>(static_cast<std::int64_t>(format.offset))};
+    const std::int64_t range = std::int64_t{1} << field.place.width;
+    const std::int64_t least = field.place.isSigned ? -range / 2 : 0;
+    for (const std::int64_t end : {least, least + range - 1})
+        if (shownNumber(field, end) != static_cast<double>(end) * line.scale + line.offset)
+            return std::nullopt;
+    return line;
+}
+
 std::string_view codeText(const Field& field, std::int64_t number, TextArena& texts) {
     if (number < 0 || number > largestCode)
         return {};

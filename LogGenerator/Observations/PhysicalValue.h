@@ -7,6 +7,7 @@
 #include "LogGenerator/Observations/TextArena.h"
 
 #include <cstdint>
+#include <optional>
 #include <string_view>
 
 namespace velmora {
@@ -15,6 +16,14 @@ class Value;
 
 /// The number that the field's format shows of a raw value, but with the sign that it means.
 [[nodiscard]] double shownNumber(const Field& field, std::int64_t raw);
+
+/// That number as a line: the raw value times `scale` plus `offset`.
+struct ShownLine {
+    double scale;
+    double offset;
+};
+/// Absent where the number is not on one line for all that the field's place can hold.
+[[nodiscard]] std::optional<ShownLine> shownLine(const Field& field);
 
 /// A mobile country or network code (3GPP TS 23.003 2.2) of a number, with the zeros in front that it has at
 /// least; empty for a number that is none.
