@@ -117,6 +117,7 @@ void VelmoraApp::applicationWillTerminate() {
         _window->setHidden(true);
     _recording->stop();
     _navController->setAccessories({});
+    _drive->setRecorded(nullptr);
     _playback.reset();
     setWindow(nullptr);
     _model->setDrive(nullptr);
@@ -213,7 +214,7 @@ void VelmoraApp::togglePrivacy() {
 }
 
 void VelmoraApp::pinFocusRow() {
-    if (_model && !_playback) // charts are of what is received
+    if (_model)
         static_cast<VelmoraPaneController&>(*_navController->topViewController()).togglePinOfFocusRow();
 }
 

@@ -47,7 +47,8 @@ void VelmoraApp::openRecording(const std::string& path, const std::string& techn
                                  {[this] { showMoment(); }, [this] { updateNotice(); },
                                   [this](const LoggedMessage& message, std::string_view shown) {
                                       return _privacy->shown(message.message, shown, message.time);
-                                  }});
+                                  },
+                                  [this] { return _platform->ruleFiles(); }});
     if (!opened) {
         const std::string reason = path + ": " + opened.reason();
         logLine(LogPriority::Error, reason);
@@ -57,8 +58,8 @@ void VelmoraApp::openRecording(const std::string& path, const std::string& techn
     _endsOnceSaved = false;
     closeSaveView();
     _navController->setAccessories({});
-    _playback = *std::move(opened);
-    _drive->setLive(false);
+    const std::unique_ptr<PlaybackController> earlier = std::exchange(_playback, *std::move(opened));
+    _drive->setRecorded(&_playback->drive());
     clearPanes();
     showBars();
     showMoment();
@@ -70,8 +71,8 @@ void VelmoraApp::closeRecording() {
         return;
     closeSaveView();
     _navController->setAccessories({});
+    _drive->setRecorded(nullptr);
     _playback.reset();
-    _drive->setLive(true);
     showBars();
     clearPanes();
     if (std::exchange(_recordingPath, {}).empty())
@@ -90,6 +91,9 @@ void VelmoraApp::showMoment() {
         status += ", " + progress;
     setUpdateMessage(std::move(status));
     redraw();
+    // While it plays the drive view follows in steps of its own.
+    if (!_playback->isPlaying())
+        _drive->showMoment();
 }
 
 } // namespace velmora

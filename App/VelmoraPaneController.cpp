@@ -140,20 +140,20 @@ void VelmoraPaneController::didSelectRowAtIndexPath(TableView& tableView, const 
 }
 
 std::vector<MenuItem> VelmoraPaneController::menuForRowAtIndexPath(TableView&, const IndexPath& indexPath) {
-    DriveModel& drive = _app.drive().model();
+    const DriveModel& drive = static_cast<const DriveSource&>(_app.drive().source()).model();
     std::string path = pathOfRow(indexPath);
     if (nodeAt(indexPath)->childNodes() || !drive.canPin(path))
         return {};
     const char* const title = drive.isPinned(path) ? "Unpin Chart" : "Pin as Chart";
-    // The pane may be gone when the menu is answered.
-    return {{title, [&drive, row = std::move(path)] { (void)drive.togglePin(row); }}};
+    // The pane and what the drive view shows may be gone when the menu is answered.
+    return {{title, [&app = _app, row = std::move(path)] { (void)app.drive().source().togglePin(row); }}};
 }
 
 void VelmoraPaneController::togglePinOfFocusRow() {
     const IndexPath row = tableView().indexPathForFocusRow();
     if (row.isNull() || nodeAt(row)->childNodes())
         return;
-    (void)_app.drive().model().togglePin(pathOfRow(row));
+    (void)_app.drive().source().togglePin(pathOfRow(row));
 }
 
 std::string VelmoraPaneController::pathOfRow(const IndexPath& indexPath) const {

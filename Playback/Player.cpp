@@ -13,11 +13,8 @@ Result<std::unique_ptr<Player>> Player::make(const PlayedFile& file, const Recor
                                              PlayedDecoder::Masking masking) {
     const QuietDecoding quiet;
     std::unique_ptr<Player> player(new Player(file, index, std::move(masking)));
-    Result<Reading> reading = player->readingFrom(index.checkpoints().front());
-    if (!reading)
-        return Failure{reading.reason()};
-    player->_reader = std::move(reading->reader);
-    player->_decoder = std::move(reading->decoder);
+    if (!player->jumpTo(index.checkpoints().front()))
+        return Failure{player->_failure};
     return player;
 }
 
@@ -48,8 +45,12 @@ bool Player::jumpTo(const RecordingIndex::Checkpoint& checkpoint) {
     }
     _failure.clear();
     _ahead.reset();
+    _picture.reset(); // of the earlier decoder
     _reader = std::move(reading->reader);
     _decoder = std::move(reading->decoder);
+    _picture = std::make_unique<PlayedPicture>(_decoder->decoder(),
+                                               checkpoint.decoder ? &checkpoint.picture : nullptr);
+    _losses = 0;
     return true;
 }
 
@@ -69,7 +70,12 @@ bool Player::lookAhead() {
 bool Player::takeNext() {
     if (!lookAhead())
         return false;
+    if (const std::uint64_t losses = _reader->lossTotals().losses; std::exchange(_losses, losses) != losses)
+        _picture->damaged();
+    const std::uint64_t undecoded = _decoder->undecoded();
     _decoder->take(*_ahead);
+    if (_decoder->undecoded() != undecoded)
+        _picture->undecoded(_ahead->time);
     _ahead.reset();
     return true;
 }

@@ -5,6 +5,7 @@
 
 #include "Playback/PlayedDecoder.h"
 #include "Playback/PlayedFile.h"
+#include "Playback/PlayedPicture.h"
 #include "Playback/RecordingIndex.h"
 
 #include <cstdint>
@@ -47,6 +48,8 @@ public:
 
     /// The display at the moment; none before the first message.
     [[nodiscard]] Value display() { return _decoder->display(); }
+    /// What the messages before the moment have reported of the radio network.
+    [[nodiscard]] const RadioPicture& picture() const { return _picture->picture(); }
     /// What a snapshot of the moment saves, and the time of its last refresh.
     struct Saved {
         ArrayRef contents;
@@ -78,6 +81,8 @@ private:
     PlayedDecoder::Masking _masking;
     std::unique_ptr<MessageReader> _reader;
     std::unique_ptr<PlayedDecoder> _decoder;
+    std::unique_ptr<PlayedPicture> _picture; ///< of the decoder
+    std::uint64_t _losses = 0;               ///< of the reader, that the picture has got
     std::optional<LoggedMessage> _ahead;
     std::string _failure;
 };

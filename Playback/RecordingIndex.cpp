@@ -15,7 +15,8 @@ namespace velmora {
 namespace {
 
 std::size_t sizeOf(const RecordingIndex::Checkpoint& checkpoint) {
-    std::size_t size = sizeof checkpoint + (checkpoint.decoder ? checkpoint.decoder->size : 0);
+    std::size_t size = sizeof checkpoint + (checkpoint.decoder ? checkpoint.decoder->size : 0) +
+                       checkpoint.picture.picture.size();
     if (checkpoint.place.recording)
         size += sizeof *checkpoint.place.recording + checkpoint.place.recording->interfaces.size() *
                                                          sizeof(checkpoint.place.recording->interfaces[0]);
@@ -83,12 +84,39 @@ bool RecordingIndex::read(std::uint64_t messages) {
             addCheckpoint();
         const std::optional<LoggedMessage> message =
             _ahead ? std::exchange(_ahead, std::nullopt) : _file.next();
+        if (_file.reader().lossTotals().losses != _losses)
+            reportLosses();
         if (!message)
-            _isComplete = true;
+            finish();
         else if (has(*message))
             take(*message);
     }
     return !_isComplete;
+}
+
+void RecordingIndex::reportLosses() {
+    _losses = _file.reader().lossTotals().losses;
+    const std::vector<Loss>& kept = _file.reader().losses();
+    if (_pass)
+        _pass->damaged(_losses <= kept.size() ? std::string_view(kept.back().reason) : "damaged");
+}
+
+/// Those on the latest message, of the first ones in the file, which are kept.
+void RecordingIndex::reportNotes() {
+    const Comments& comments = _file.reader().comments();
+    for (; _comments < comments.first().size(); ++_comments)
+        if (const Comment& each = comments.first()[_comments]; _pass && each.about == Comment::About::Message)
+            _pass->noted(each.text);
+    _comments = comments.count();
+}
+
+void RecordingIndex::finish() {
+    _isComplete = true;
+    if (!_pass)
+        return;
+    if (const std::string failure = _file.failure(); !failure.empty())
+        _pass->damaged(failure);
+    _pass->finished();
 }
 
 void RecordingIndex::take(const LoggedMessage& message) {
@@ -96,7 +124,12 @@ void RecordingIndex::take(const LoggedMessage& message) {
     if (!_first)
         _first = message.time;
     _latest = std::max(_latest, message.time);
-    if (_decoder->undecoded() == _undecoded.messages)
+    const bool isUndecoded = _decoder->undecoded() != _undecoded.messages;
+    if (isUndecoded && _pass)
+        _pass->undecoded(message.time);
+    if (_file.reader().comments().count() != _comments)
+        reportNotes();
+    if (!isUndecoded)
         return;
     if (++_undecoded.messages == 1) {
         _undecoded.number = message.number;
@@ -106,7 +139,8 @@ void RecordingIndex::take(const LoggedMessage& message) {
 }
 
 void RecordingIndex::addCheckpoint() {
-    _checkpoints.push_back({_file.place(), _decoder->checkpoint(), _latest});
+    _checkpoints.push_back(
+        {_file.place(), _decoder->checkpoint(), _latest, _pass ? _pass->memory() : PlayedPicture::Memory()});
     _memory += sizeOf(_checkpoints.back());
     while (_memory > _memoryLimit && _checkpoints.size() > 2)
         thinOut();

@@ -3,6 +3,7 @@
 
 #pragma once
 
+#include "Playback/IndexPass.h"
 #include "Playback/PlayedDecoder.h"
 #include "Playback/PlayedFile.h"
 
@@ -30,6 +31,7 @@ public:
         MessagePlace place;
         std::optional<PlayedDecoder::Checkpoint> decoder; ///< none at the drive's start
         Time latest = Time::min();                        ///< of the messages before it
+        PlayedPicture::Memory picture{};                  ///< empty without a pass
 
         [[nodiscard]] std::uint64_t messages() const { return decoder ? decoder->messages : 0; }
         [[nodiscard]] std::uint64_t refreshes() const { return decoder ? decoder->refreshes.count() : 0; }
@@ -44,6 +46,10 @@ public:
                                                         PlayedDecoder::Masking masking) {
         return make(file, technology, std::move(masking), Limits());
     }
+
+    /// What is made of the messages that are read from now on; null for nothing, which is the default. It
+    /// must outlive this, or be taken off.
+    void setPass(IndexPass* pass) { _pass = pass; }
 
     /// Reads at most that many messages of the file on. False once all is read.
     bool read(std::uint64_t messages);
@@ -86,6 +92,9 @@ private:
         : _file(file), _memoryLimit(limits.memory), _spacing(limits.spacing) {}
     [[nodiscard]] Result<Done> choose(const std::string& technology);
     void take(const LoggedMessage& message);
+    void reportLosses();
+    void reportNotes();
+    void finish();
     void addCheckpoint();
     void thinOut();
 
@@ -102,6 +111,9 @@ private:
     std::optional<Time> _first;
     Time _latest = Time::min();
     Undecoded _undecoded;
+    IndexPass* _pass = nullptr;
+    std::uint64_t _losses = 0;   ///< that the pass has got
+    std::uint64_t _comments = 0; ///< of them those on messages
     bool _isComplete = false;
 };
 

@@ -9,8 +9,8 @@
 
 namespace velmora {
 
-DriveModel::DriveModel(DriveSamples& samples, const Clock& clock, RuleFiles rules)
-    : _samples(samples), _clock(clock), _rules(std::move(rules)) {}
+DriveModel::DriveModel(DriveSamples& samples, const Clock& clock, RuleFiles rules, std::size_t mostEvents)
+    : _samples(samples), _clock(clock), _rules(std::move(rules)), _events(mostEvents) {}
 
 void DriveModel::setDecoder(LogGenerator* decoder) {
     if (_engine)
@@ -64,6 +64,33 @@ void DriveModel::observed(const ObservedMessage& message) {
     ++_messages;
     _latest = message.arrival;
     report({{0, message.number}, message.arrival, message});
+}
+
+bool DriveModel::wants(const CatalogueField& leaf) const {
+    return _engine->wants(leaf) || std::any_of(_pinned.begin(), _pinned.end(),
+                                               [&leaf](const auto& each) { return each.leaf() == &leaf; });
+}
+
+void DriveModel::undecoded(Time arrival) {
+    ObservedMessage nothing{};
+    nothing.arrival = arrival;
+    nothing.damage = Damage::Unreadable;
+    observed(nothing);
+}
+
+void DriveModel::noted(std::string_view text) {
+    if (_engine)
+        _engine->noted({}, text);
+}
+
+void DriveModel::damaged(std::string_view reason) {
+    if (_engine)
+        _engine->damaged({}, reason);
+}
+
+void DriveModel::finish() {
+    if (_engine)
+        _engine->finish();
 }
 
 void DriveModel::report(const MessageReport& report) {
@@ -138,6 +165,7 @@ bool DriveModel::togglePin(const std::string& path) {
     if (!_decoder || _pinned.size() >= mostPinned || !row.find(_decoder->catalogue()))
         return false;
     _pinned.push_back(std::move(row));
+    _decoder->setObservationSink(this); // which wants one leaf more now
     _samples.pinned(series().back());
     return true;
 }

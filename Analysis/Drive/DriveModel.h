@@ -18,6 +18,7 @@
 #include <optional>
 #include <span>
 #include <string>
+#include <string_view>
 #include <utility>
 #include <vector>
 
@@ -30,8 +31,9 @@ public:
     using RuleFiles = std::function<std::vector<RuleFile>()>;
 
     /// `samples` gets the numbers over time and must outlive it. `rules` is called for each decoder; `clock`
-    /// is for the catalogues that rules are checked against.
-    DriveModel(DriveSamples& samples, const Clock& clock, RuleFiles rules = {});
+    /// is for the catalogues that rules are checked against. Of more than `mostEvents` the oldest go.
+    DriveModel(DriveSamples& samples, const Clock& clock, RuleFiles rules = {},
+               std::size_t mostEvents = DriveEvents::most);
     DriveModel(const DriveModel&) = delete;
     DriveModel& operator=(const DriveModel&) = delete;
 
@@ -45,9 +47,21 @@ public:
     void reset();
 
     void observed(const ObservedMessage& message) override;
+    /// What the detectors, the samples and the pinned rows use.
+    [[nodiscard]] bool wants(const CatalogueField& leaf) const override;
 
-    /// What is known after the latest message.
-    [[nodiscard]] DriveNow now() const;
+    /// A message of that time could not be decoded.
+    void undecoded(Time arrival);
+    /// The recording has a comment on the latest message.
+    void noted(std::string_view text);
+    /// The reader of the recording found damage.
+    void damaged(std::string_view reason);
+    /// There are no more messages.
+    void finish();
+
+    /// What is known after the latest message; null without a decoder.
+    [[nodiscard]] const RadioPicture* picture() const { return _engine ? &_engine->picture() : nullptr; }
+    [[nodiscard]] DriveNow now() const { return _engine ? driveNow(_engine->picture()) : DriveNow(); }
     /// The strongest first; those without a level last.
     [[nodiscard]] std::span<const Neighbour> neighbours() const;
     /// The newest first.
@@ -57,6 +71,9 @@ public:
     [[nodiscard]] std::uint64_t messages() const { return _messages; }
     /// Of the latest message; absent before the first.
     [[nodiscard]] std::optional<Time> latest() const { return _latest; }
+
+    /// The latest time of the messages, those that go back by a little left aside; absent before the first.
+    [[nodiscard]] std::optional<Time> lastChecked() const { return _engine ? _engine->last() : std::nullopt; }
 
     /// How good levels and qualities are, by the rules.
     [[nodiscard]] const LevelClasses& classes() const { return _classes; }

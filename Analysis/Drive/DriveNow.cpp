@@ -1,7 +1,8 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Analysis/Drive/DriveModel.h"
+#include "Analysis/Drive/DriveNow.h"
+
 #include "Analysis/Picture/ChannelBand.h"
 
 #include <algorithm>
@@ -32,11 +33,8 @@ std::string decimalNumber(double number) {
 
 } // namespace
 
-DriveNow DriveModel::now() const {
+DriveNow driveNow(const RadioPicture& picture) {
     DriveNow now;
-    if (!_engine)
-        return now;
-    const RadioPicture& picture = _engine->picture();
     now.technology = picture.technology();
     now.mode = picture.mode();
     const auto value = [&](Role role, auto text) -> std::optional<DriveValue> {

@@ -3,6 +3,7 @@
 
 #pragma once
 
+#include "Analysis/Picture/RadioPicture.h"
 #include "Analysis/Picture/RadioTechnology.h"
 #include "Platform/Clock.h"
 
@@ -37,5 +38,8 @@ struct DriveNow {
     std::optional<DriveValue> level;   ///< dBm
     std::optional<DriveValue> quality; ///< dB
 };
+
+/// What the picture knows of it.
+[[nodiscard]] DriveNow driveNow(const RadioPicture& picture);
 
 } // namespace velmora

@@ -42,6 +42,8 @@ public:
     /// The input has ended.
     void finish();
 
+    /// The latest time of the messages; absent before the first and after the end.
+    [[nodiscard]] std::optional<Time> last() const { return _checks.last(); }
     /// What is known after the latest message.
     [[nodiscard]] const RadioPicture& picture() const { return _picture; }
 

@@ -33,6 +33,8 @@ public:
     /// The recording has a comment on that message, which is the latest.
     void noted(MessageNumber message, std::string_view text);
     void finish() { _last.reset(); }
+    /// Continues after a message of that time.
+    void continueFrom(Time last) { _last = Last{last, last, {}}; }
 
     /// Absent before the first message, and after the end of the input.
     [[nodiscard]] std::optional<Time> last() const {

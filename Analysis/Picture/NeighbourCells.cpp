@@ -8,6 +8,7 @@
 #include <algorithm>
 #include <bit>
 #include <limits>
+#include <utility>
 
 namespace velmora {
 
@@ -71,6 +72,14 @@ void NeighbourCells::add(const Observation& observation, const LeafUse& use, con
     } else if (use.part == NeighbourPart::Technology) {
         cell.neighbour.technology = technologyOf(observation.raw, table);
     }
+}
+
+void NeighbourCells::setAll(std::vector<Neighbour> cells, std::vector<const CatalogueNode*> lists) {
+    _cells = std::move(cells);
+    _lists = std::move(lists);
+    _oldest = Time::max();
+    for (const Neighbour& each : _cells)
+        _oldest = std::min(_oldest, each.time);
 }
 
 bool NeighbourCells::isReplaced(const Neighbour& cell, const CatalogueNode* list, Time now) const {

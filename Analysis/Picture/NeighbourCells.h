@@ -35,6 +35,10 @@ public:
     /// Those of earlier messages.
     void forgetAll() { _cells.clear(), _lists.clear(), _oldest = Time::max(); }
 
+    /// Those of a picture of another decoder, in the order of their levels, and their lists.
+    void setAll(std::vector<Neighbour> cells, std::vector<const CatalogueNode*> lists);
+    [[nodiscard]] const std::vector<const CatalogueNode*>& lists() const { return _lists; }
+
     /// The strongest first; those without a level last.
     [[nodiscard]] std::span<const Neighbour> cells() const { return _cells; }
 

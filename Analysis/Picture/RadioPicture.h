@@ -8,6 +8,7 @@
 #include "Analysis/Picture/LeafTable.h"
 #include "Analysis/Picture/LeafUse.h"
 #include "Analysis/Picture/NeighbourCells.h"
+#include "Analysis/Picture/PictureMemory.h"
 #include "Analysis/Picture/RadioSideState.h"
 #include "Analysis/Picture/RadioTechnology.h"
 #include "Analysis/Picture/Reading.h"
@@ -41,6 +42,11 @@ public:
     void update(const MessageReport& report);
     /// Nothing is known any more.
     void clear();
+
+    /// What is known, which another picture of this technology may continue from.
+    [[nodiscard]] PictureMemory memory() const;
+    /// Continues from there instead of from nothing.
+    void setMemory(const PictureMemory& memory);
 
     [[nodiscard]] const Catalogue& catalogue() const { return _catalogue; }
     /// Null where it is not known. For the roles of neighbours that of the strongest one of the serving

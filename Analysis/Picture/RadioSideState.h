@@ -54,6 +54,10 @@ struct RadioSideState {
     [[nodiscard]] bool reportsCell(const TechnologyTable& table) const;
     void forgetCell();
     void forgetAll();
+    /// Whether it has anything that later messages or their readers would find.
+    [[nodiscard]] bool isAnythingKnown() const {
+        return isReported || mode || before || since || !readings.isEmpty();
+    }
 
     void beginMessage() {
         modeBefore = mode;

@@ -6,6 +6,8 @@
 #include "Analysis/Picture/LeafUse.h"
 #include "Analysis/Picture/PhysicalCell.h"
 
+#include <algorithm>
+
 namespace velmora {
 
 void RoleReadings::keep(Role role, const Observation& observation, const MessageReport& report,
@@ -63,6 +65,10 @@ void RoleReadings::forgetServing() {
     for (std::size_t i = 0; i < _slots.size(); ++i)
         if (isServing(static_cast<Role>(i)))
             _slots[i].isKnown = false;
+}
+
+bool RoleReadings::isEmpty() const {
+    return std::none_of(_slots.begin(), _slots.end(), [](const Slot& each) { return each.isKnown; });
 }
 
 void RoleReadings::forgetAll() {

@@ -32,6 +32,14 @@ public:
     void forgetServing();
     void forgetAll();
 
+    [[nodiscard]] bool isEmpty() const;
+    /// Replaces the leaves that the readings are from; those without another are from none.
+    template <class Find>
+    void findLeaves(Find find) {
+        for (Slot& each : _slots)
+            each.reading.leaf = each.isKnown && each.reading.leaf ? find(*each.reading.leaf) : nullptr;
+    }
+
 private:
     struct Slot {
         Reading reading; ///< its text keeps its storage when the value is forgotten

@@ -4,7 +4,8 @@
 #include "App/DriveView/DriveCharts.h"
 
 #include <algorithm>
-#include <chrono>
+#include <array>
+#include <utility>
 
 namespace velmora {
 
@@ -51,8 +52,7 @@ std::string keyOf(const ChartPanel& panel) {
 
 } // namespace
 
-DriveCharts::DriveCharts(const DriveModel& model, const DriveHistory& history)
-    : _model(model), _history(history) {
+DriveCharts::DriveCharts(DriveSource& source) : _source(&source) {
     _chart.setAccessibleName("Over time");
     addSubview(_chart);
     const auto add = [this](const char* title, const char* name, std::function<void()> action) {
@@ -63,34 +63,81 @@ DriveCharts::DriveCharts(const DriveModel& model, const DriveHistory& history)
         addSubview(button);
     };
     for (const Span& each : spans)
-        add(each.title, each.name, [this, span = each.span] { _chart.setSpan(span), markSpan(); });
-    add("Now", "Follow now", [this] { _chart.followNow(), markSpan(); });
+        add(each.title, each.name, [this, span = each.span] { chooseSpan(span); });
+    add("Now", "Follow now", [this] { chooseNow(); });
     add("Table", "Show as a table", [this] { _chart.setShowsTable(_buttons[tableButton]->isOn()); });
-    _chart.setSpan(5min);
     _chart.setOnRangeChanged([this] { markSpan(); });
-    markSpan();
+    _chart.setOnCursorMoved([this](std::optional<std::int64_t> time_ns) {
+        if (time_ns)
+            _source->choose(Time(std::chrono::nanoseconds(*time_ns)));
+    });
+    setSource(source);
+}
+
+void DriveCharts::setSource(DriveSource& source) {
+    _source = &source;
+    _chart.setCursor({});
+    if (source.isRecorded())
+        _chart.setSpan(std::nullopt);
+    else
+        _chart.setSpan(5min);
     updatePanels();
+    _eventsRevision = source.model().eventsRevision() + 1; // whichever it had
+    _bandsRevision = source.history().bandsRevision() + 1;
+    update();
+    updateMoment();
+    markSpan();
+}
+
+void DriveCharts::chooseSpan(std::optional<std::chrono::nanoseconds> span) {
+    const std::optional<std::int64_t> cursor_ns = _chart.cursor();
+    if (_source->isRecorded() && span && cursor_ns)
+        _chart.setRange({*cursor_ns - span->count() / 2, *cursor_ns + span->count() / 2});
+    else
+        _chart.setSpan(span);
+    markSpan();
+}
+
+void DriveCharts::chooseNow() {
+    if (_source->isRecorded())
+        _source->choose(_source->end());
+    else
+        _chart.followNow();
+    markSpan();
 }
 
 DriveCharts::~DriveCharts() {
     _chart.setOnRangeChanged({});
+    _chart.setOnCursorMoved({});
 }
 
 void DriveCharts::markSpan() {
+    // A recording's range does not follow its end, unless it is the whole one.
+    const bool isPart = _source->isRecorded() && !_chart.isFollowing();
     for (std::size_t i = 0; i < spans.size(); ++i)
-        _buttons[i]->setOn(_chart.span() == spans[i].span);
-    _buttons[nowButton]->setOn(_chart.isFollowing());
+        _buttons[i]->setOn(isPart ? spans[i].span && _chart.range().length_ns() == spans[i].span->count()
+                                  : _chart.span() == spans[i].span);
+    _buttons[nowButton]->setOn(_source->isRecorded() ? _source->moment() >= _source->end()
+                                                     : _chart.isFollowing());
 }
 
-void DriveCharts::update(Time now) {
+void DriveCharts::update() {
     updatePanels();
     updateTicks();
-    if (std::exchange(_bandsRevision, _history.bandsRevision()) != _history.bandsRevision())
-        _chart.setBands(_history.bands());
-    if (std::exchange(_messages, _model.messages()) != _model.messages())
+    const DriveHistory& history = _source->history();
+    if (std::exchange(_bandsRevision, history.bandsRevision()) != history.bandsRevision())
+        _chart.setBands(history.bands());
+    if (std::exchange(_messages, _source->revision()) != _source->revision())
         _chart.samplesChanged();
-    _chart.setNow(nanosecondsOf(now));
+    _chart.setNow(nanosecondsOf(_source->end()));
     _buttons[tableButton]->setOn(_chart.showsTable());
+}
+
+void DriveCharts::updateMoment() {
+    if (!_source->isRecorded())
+        return;
+    _chart.setCursor(nanosecondsOf(_source->moment()));
+    markSpan();
 }
 
 void DriveCharts::showMoment(Time time) {
@@ -102,13 +149,13 @@ ChartPanel DriveCharts::rolePanel(const char* title, const char* unit, Role role
     ChartPanel panel;
     panel.title = title;
     panel.unit = unit;
-    const std::vector<DriveSeries> all = _model.series();
+    const std::vector<DriveSeries> all = _source->model().series();
     for (std::size_t i = 0; i <= chartedNeighbours; ++i) {
-        panel.series.push_back(
-            {all[first + i].name, _history.ring(first + i), static_cast<ChartColor>(i), lines[i], false});
-        panel.decimals = std::max(panel.decimals, _history.decimals(first + i));
+        panel.series.push_back({all[first + i].name, _source->history().ring(first + i),
+                                static_cast<ChartColor>(i), lines[i], false});
+        panel.decimals = std::max(panel.decimals, _source->history().decimals(first + i));
     }
-    if (const LevelLimits* const limits = _model.classes().limits(_model.now().technology, role))
+    if (const LevelLimits* const limits = _source->model().classes().limits(_source->now().technology, role))
         panel.limits = {{limits->fair, "fair"}, {limits->good, "good"}, {limits->excellent, "excellent"}};
     return panel;
 }
@@ -117,14 +164,14 @@ ChartPanel DriveCharts::pinnedPanel(const DriveSeries& series, std::size_t numbe
     ChartPanel panel;
     panel.title = series.name;
     panel.unit = nameOf(series.unit);
-    panel.decimals = _history.decimals(number);
-    panel.series.push_back({series.name.substr(series.name.rfind('/') + 1), _history.ring(number),
+    panel.decimals = _source->history().decimals(number);
+    panel.series.push_back({series.name.substr(series.name.rfind('/') + 1), _source->history().ring(number),
                             ChartColor::first, ChartLine::solid, true});
     return panel;
 }
 
 void DriveCharts::updatePanels() {
-    const std::vector<DriveSeries> all = _model.series();
+    const std::vector<DriveSeries> all = _source->model().series();
     updatePanel(0, rolePanel("Level", "dBm", Role::ServingLevel, servingLevelSeries));
     updatePanel(1, rolePanel("Quality", "dB", Role::ServingQuality, servingQualitySeries));
     std::size_t index = 2;
@@ -143,10 +190,11 @@ void DriveCharts::updatePanel(std::size_t index, ChartPanel panel) {
 }
 
 void DriveCharts::updateTicks() {
-    if (std::exchange(_eventsRevision, _model.eventsRevision()) == _model.eventsRevision())
+    const DriveModel& model = _source->model();
+    if (std::exchange(_eventsRevision, model.eventsRevision()) == model.eventsRevision())
         return;
     std::vector<ChartTick> ticks;
-    for (auto each = _model.events().rbegin(); each != _model.events().rend(); ++each)
+    for (auto each = model.events().rbegin(); each != model.events().rend(); ++each)
         ticks.push_back({nanosecondsOf(each->time), toChart(each->severity),
                          each->text.empty() ? each->kind : each->text});
     _chart.setTicks(std::move(ticks));

@@ -3,13 +3,13 @@
 
 #pragma once
 
-#include "Analysis/Drive/DriveModel.h"
-#include "App/DriveView/DriveHistory.h"
+#include "App/DriveView/DriveSource.h"
 #include "Toolkit/Button.h"
 #include "Toolkit/Charts/ChartView.h"
 
-#include <array>
+#include <chrono>
 #include <memory>
+#include <optional>
 #include <string>
 #include <vector>
 
@@ -19,12 +19,16 @@ namespace velmora {
 /// bands of radio technology and state; with buttons for the span of time.
 class DriveCharts final : public View {
 public:
-    /// Both must outlive it.
-    DriveCharts(const DriveModel& model, const DriveHistory& history);
+    /// It must outlive this, until another takes its place.
+    explicit DriveCharts(DriveSource& source);
     ~DriveCharts() override;
 
-    /// Takes over what is new, up to that time.
-    void update(Time now);
+    /// Shows another drive: the whole of a recording, the last minutes of what is received.
+    void setSource(DriveSource& source);
+    /// Takes over what is new.
+    void update();
+    /// Brings the moment of a recording into view.
+    void updateMoment();
     /// Brings the moment into view and shows the values that counted then.
     void showMoment(Time time);
     [[nodiscard]] ChartView& chart() { return _chart; }
@@ -45,10 +49,11 @@ private:
                                        std::size_t first) const;
     [[nodiscard]] ChartPanel pinnedPanel(const DriveSeries& series, std::size_t number) const;
     void updateTicks();
+    void chooseSpan(std::optional<std::chrono::nanoseconds> span);
+    void chooseNow();
     void markSpan();
 
-    const DriveModel& _model;
-    const DriveHistory& _history;
+    DriveSource* _source;
     ChartView _chart;
     std::vector<std::unique_ptr<Button>> _buttons;
     std::vector<Panel> _panels;

@@ -20,10 +20,9 @@ constexpr const char* buttonTitle = "Drive";
 } // namespace
 
 DriveScreen::DriveScreen(AppPlatform& platform, std::function<bool()> isConnected)
-    : _platform(platform), _isConnected(std::move(isConnected)),
-      _model(_history, platform.model().clock, [&platform] { return platform.ruleFiles(); }),
-      _controller(std::make_shared<DriveViewController>(_model, _history, platform.model().clock,
-                                                        platform.model().queue, [this] { return link(); })),
+    : _platform(platform), _live(platform, std::move(isConnected)),
+      _controller(
+          std::make_shared<DriveViewController>(_live, platform.model().clock, platform.model().queue)),
       _stack(std::make_shared<NavigationController>(_controller)),
       _isBeside(!platform.preferences().boolean(domain, closedKey)) {
     _stack->setNamesWindow(false); // the panes do
@@ -37,7 +36,7 @@ DriveScreen::~DriveScreen() {
 std::shared_ptr<SplitController>
 DriveScreen::standBeside(const std::shared_ptr<NavigationController>& panes) {
     _panes = panes;
-    setButton();
+    _panes->setHeaderCommand(buttonTitle, [this] { toggle(); });
     _split = std::make_shared<SplitController>(panes, _stack);
     _split->setOnWidthChanged([this] { arrange(); });
     arrange();
@@ -50,30 +49,25 @@ void DriveScreen::arrange() {
         _stack->setLeave({}, {});
     else
         _stack->setLeave("Velmora", [this] { toggle(); });
-    _split->setSecondShown(_isLive && (_split->isWide() ? _isBeside : _isOpen));
+    _split->setSecondShown(_split->isWide() ? _isBeside : _isOpen);
 }
 
 bool DriveScreen::isShown() const {
     return _split && _split->isSecondShown();
 }
 
-void DriveScreen::setButton() {
-    if (_isLive)
-        _panes->setHeaderCommand(buttonTitle, [this] { toggle(); });
-    else
-        _panes->setHeaderCommand({}, {});
+void DriveScreen::setRecorded(DriveSource* recorded) {
+    _source = recorded ? recorded : &_live;
+    _controller->setSource(*_source);
 }
 
-void DriveScreen::setLive(bool isLive) {
-    _isLive = isLive;
-    if (!_split)
-        return;
-    setButton();
-    arrange();
+void DriveScreen::showMoment() {
+    if (isShown())
+        _controller->refreshNow();
 }
 
 void DriveScreen::toggle() {
-    if (!_split || !_isLive)
+    if (!_split)
         return;
     if (_split->isWide()) {
         _isBeside = !_isBeside;
@@ -92,19 +86,13 @@ void DriveScreen::open() {
 }
 
 void DriveScreen::linkLost() {
-    _model.interrupt();
+    _live.model().interrupt();
 }
 
 void DriveScreen::forget() {
-    _model.reset();
+    _live.model().reset();
     if (isShown())
         _controller->refreshNow();
-}
-
-std::string DriveScreen::link() const {
-    if (_isConnected())
-        return {};
-    return _model.messages() > 0 ? "Link lost: no messages arrive" : "Not connected";
 }
 
 } // namespace velmora

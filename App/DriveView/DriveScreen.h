@@ -3,14 +3,12 @@
 
 #pragma once
 
-#include "Analysis/Drive/DriveModel.h"
 #include "App/AppPlatform.h"
-#include "App/DriveView/DriveHistory.h"
 #include "App/DriveView/DriveViewController.h"
+#include "App/DriveView/LiveDrive.h"
 
 #include <functional>
 #include <memory>
-#include <string>
 
 namespace velmora {
 
@@ -32,8 +30,11 @@ public:
     [[nodiscard]] std::shared_ptr<SplitController>
     standBeside(const std::shared_ptr<NavigationController>& panes);
 
-    [[nodiscard]] DriveModel& model() { return _model; }
-    [[nodiscard]] const DriveHistory& history() const { return _history; }
+    /// What is received.
+    [[nodiscard]] DriveModel& model() { return _live.model(); }
+    [[nodiscard]] const DriveHistory& history() const { return _live.history(); }
+    /// What is shown.
+    [[nodiscard]] DriveSource& source() { return *_source; }
     [[nodiscard]] DriveViewController& controller() { return *_controller; }
     [[nodiscard]] bool isShown() const;
 
@@ -41,28 +42,27 @@ public:
     void toggle();
     /// Shows it, on a narrow window too.
     void open();
-    /// Whether the panes show what is received, as the view always does; they do at first. Otherwise the view
-    /// and its button are hidden.
-    void setLive(bool isLive);
+    /// Shows a recording, which must outlive this until another takes its place; null for what is received,
+    /// which is shown at first.
+    void setRecorded(DriveSource* recorded);
+    /// The moment of the recording is another.
+    void showMoment();
     /// The connection was lost.
     void linkLost();
     /// Forgets everything, on the screen too.
     void forget();
 
 private:
-    [[nodiscard]] std::string link() const;
     void arrange();
     void setButton();
 
     AppPlatform& _platform;
-    std::function<bool()> _isConnected;
-    DriveHistory _history;
-    DriveModel _model;
+    LiveDrive _live;
+    DriveSource* _source = &_live;
     std::shared_ptr<DriveViewController> _controller;
     std::shared_ptr<NavigationController> _stack;
     std::shared_ptr<NavigationController> _panes;
     std::shared_ptr<SplitController> _split;
-    bool _isLive = true;
     bool _isOpen = false; ///< on a narrow window
     bool _isBeside;       ///< on a wide one
 };

@@ -5,6 +5,7 @@
 
 #include "Analysis/Events/EventKind.h"
 #include "App/DriveView/DriveText.h"
+#include "App/DriveView/LabelText.h"
 #include "App/DriveView/NeighbourRows.h"
 
 #include <algorithm>
@@ -23,8 +24,8 @@ constexpr std::size_t eventRowsShown = 5;
 
 } // namespace
 
-DriveView::DriveView(const DriveModel& model, const DriveHistory& history, const Clock& clock)
-    : _model(model), _charts(model, history), _events(model, clock), _clock(clock) {
+DriveView::DriveView(DriveSource& source, const Clock& clock)
+    : _source(&source), _charts(source), _events(source.model(), clock), _clock(clock) {
     setAccessibleName("Drive");
     _neighbours.setAccessibleName("Neighbours");
     _neighbours.setPlaceholder("No neighbour cells have been reported.");
@@ -40,30 +41,50 @@ DriveView::DriveView(const DriveModel& model, const DriveHistory& history, const
     addSubview(_events);
     _events.setOnChoose([this](Time time) {
         _charts.showMoment(time);
+        _source->choose(time);
         setContentOffset(_chartsHeading.frame().y);
     });
 }
 
 DriveView::~DriveView() = default;
 
-void DriveView::update(Time now, std::string_view link) {
-    const DriveNow known = _model.now();
-    std::string change;
-    for (const Event& each : _model.events()) {
-        if (each.kind == rowOf(EventKind::Malformed).name)
-            continue; // says nothing about the network
-        change = clockText(each.time, _clock) + ' ' + eventText(each);
-        break;
-    }
-    _now.show(known, _model.classes(), now, link, change);
-    if (std::exchange(_columnsOf, known.technology) != known.technology)
-        _neighbours.setColumns(neighbourColumns(known.technology));
-    _neighbours.setRows(neighbourRows(_model.neighbours(), known, _model.classes(), now));
-    _events.update();
+void DriveView::setSource(DriveSource& source) {
+    _source = &source;
+    _charts.setSource(source);
+    _events.setModel(source.model());
+    update();
+    updateCharts();
 }
 
-void DriveView::updateCharts(Time now) {
-    _charts.update(now);
+std::string DriveView::latestChange() const {
+    const Time moment = _source->moment();
+    for (const Event& each : _source->model().events()) {
+        if (_source->isRecorded() && each.time > moment)
+            continue;
+        if (each.kind != rowOf(EventKind::Malformed).name) // which says nothing about the network
+            return clockText(each.time, _clock) + ' ' + eventText(each);
+    }
+    return {};
+}
+
+void DriveView::update() {
+    const DriveNow known = _source->now();
+    const Time moment = _source->moment();
+    const LevelClasses& classes = _source->model().classes();
+    _now.show(known, classes, moment, _source->link(), latestChange());
+    if (std::exchange(_columnsOf, known.technology) != known.technology)
+        _neighbours.setColumns(neighbourColumns(known.technology));
+    _neighbours.setRows(neighbourRows(_source->neighbours(), known, classes, moment));
+    _charts.updateMoment();
+    if (!_source->isRecorded()) // whose list grows by many at once while it is read
+        _events.update();
+}
+
+void DriveView::updateCharts() {
+    const std::string progress = _source->progress();
+    changeText(_chartsHeading, progress.empty() ? "Over time" : "Over time, " + progress);
+    _charts.update();
+    _events.update();
     if (std::exchange(_panels, _charts.chart().panelCount()) != _charts.chart().panelCount())
         layoutSubviews();
 }

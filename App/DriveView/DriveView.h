@@ -9,7 +9,7 @@
 #include "Toolkit/PageView.h"
 #include "Toolkit/Tables/GridView.h"
 
-#include <string_view>
+#include <string>
 
 namespace velmora {
 
@@ -17,14 +17,16 @@ namespace velmora {
 /// time, the events. A page that scrolls where it is higher than its room.
 class DriveView final : public PageView {
 public:
-    /// All must outlive it.
-    DriveView(const DriveModel& model, const DriveHistory& history, const Clock& clock);
+    /// Both must outlive it; the source until another takes its place.
+    DriveView(DriveSource& source, const Clock& clock);
     ~DriveView() override;
 
-    /// Shows what is known at that time. `link` says that no messages arrive; empty where they do.
-    void update(Time now, std::string_view link);
+    void setSource(DriveSource& source);
+
+    /// Shows what is known.
+    void update();
     /// The same of the charts, which cost more and are drawn less often.
-    void updateCharts(Time now);
+    void updateCharts();
     void layoutSubviews() override;
 
     [[nodiscard]] NowView& nowView() { return _now; }
@@ -33,7 +35,9 @@ public:
     [[nodiscard]] EventList& events() { return _events; }
 
 private:
-    const DriveModel& _model;
+    [[nodiscard]] std::string latestChange() const;
+
+    DriveSource* _source;
     NowView _now;
     Label _neighboursHeading{"Neighbours"};
     GridView _neighbours;

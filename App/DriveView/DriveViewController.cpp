@@ -8,17 +8,15 @@
 
 namespace velmora {
 
-DriveViewController::DriveViewController(const DriveModel& model, const DriveHistory& history,
-                                         const Clock& clock, MainQueue& queue,
-                                         std::function<std::string()> link)
-    : _model(model), _history(history), _clock(clock), _queue(queue), _link(std::move(link)) {
+DriveViewController::DriveViewController(DriveSource& source, const Clock& clock, MainQueue& queue)
+    : _source(&source), _clock(clock), _queue(queue) {
     setTitle("Drive");
 }
 
 DriveViewController::~DriveViewController() = default;
 
 std::unique_ptr<View> DriveViewController::loadView() {
-    auto view = std::make_unique<DriveView>(_model, _history, _clock);
+    auto view = std::make_unique<DriveView>(*_source, _clock);
     view->setBackgroundColor(Color::ground);
     return view;
 }
@@ -38,33 +36,42 @@ bool DriveViewController::becomeFirstResponder() {
     return driveView().neighbours().becomeFirstResponder();
 }
 
+void DriveViewController::setSource(DriveSource& source) {
+    _source = &source;
+    if (!isViewLoaded())
+        return;
+    driveView().setSource(source);
+    refreshNow();
+}
+
 void DriveViewController::refreshNow() {
-    const Time now = _clock.now();
-    _messages = _model.messages();
-    _second = std::chrono::floor<std::chrono::seconds>(now);
-    _shownLink = _link();
-    driveView().update(now, _shownLink);
-    _charted = now;
-    driveView().updateCharts(now);
+    _revision = _source->revision();
+    _second = std::chrono::floor<std::chrono::seconds>(_source->moment());
+    _shownLink = _source->link();
+    driveView().update();
+    showCharts();
+}
+
+void DriveViewController::showCharts() {
+    _charted = _clock.now();
+    driveView().updateCharts();
 }
 
 void DriveViewController::refresh() {
     if (!view().isOnScreen())
         return;
-    const Time now = _clock.now();
-    const Time second = std::chrono::floor<std::chrono::seconds>(now);
-    std::string link = _link();
+    const Time second = std::chrono::floor<std::chrono::seconds>(_source->moment());
+    std::string link = _source->link();
     const bool isNewSecond = std::exchange(_second, second) != second;
-    const bool hasMessages = std::exchange(_messages, _model.messages()) != _model.messages();
-    if (!isNewSecond && !hasMessages && link == _shownLink)
+    const bool isChanged = std::exchange(_revision, _source->revision()) != _source->revision();
+    if (!isNewSecond && !isChanged && link == _shownLink)
         return; // not even an age has changed
     _shownLink = std::move(link);
-    driveView().update(now, _shownLink);
+    driveView().update();
+    const Time now = _clock.now();
     // A clock may also be set back.
-    if (now - _charted < chartInterval && now >= _charted)
-        return;
-    _charted = now;
-    driveView().updateCharts(now);
+    if (now - _charted >= chartInterval || now < _charted)
+        showCharts();
 }
 
 } // namespace velmora

@@ -7,7 +7,6 @@
 #include "Platform/MainQueue.h"
 #include "Toolkit/Navigation/ViewController.h"
 
-#include <functional>
 #include <memory>
 #include <string>
 
@@ -21,14 +20,14 @@ public:
     static constexpr std::chrono::milliseconds refreshInterval{250};
     static constexpr std::chrono::seconds chartInterval{2};
 
-    /// `link` says why no messages arrive; empty where they do. All must outlive the controller.
-    DriveViewController(const DriveModel& model, const DriveHistory& history, const Clock& clock,
-                        MainQueue& queue, std::function<std::string()> link);
+    /// All must outlive the controller; the source until another takes its place.
+    DriveViewController(DriveSource& source, const Clock& clock, MainQueue& queue);
     ~DriveViewController() override;
 
     void viewWillAppear(bool animated) override;
     void viewWillDisappear(bool animated) override;
     bool becomeFirstResponder() override;
+    void setSource(DriveSource& source);
     /// Shows everything as it is now.
     void refreshNow();
     /// Precondition: the view is loaded.
@@ -39,15 +38,14 @@ protected:
 
 private:
     void refresh();
+    void showCharts();
 
-    const DriveModel& _model;
-    const DriveHistory& _history;
+    DriveSource* _source;
     const Clock& _clock;
     MainQueue& _queue;
-    std::function<std::string()> _link;
     std::unique_ptr<Timer> _timer;
     /// What the view shows.
-    std::uint64_t _messages = 0;
+    std::uint64_t _revision = 0;
     Time _second{};
     Time _charted{};
     std::string _shownLink;

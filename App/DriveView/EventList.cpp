@@ -12,7 +12,7 @@ constexpr double buttonHeight = 40;
 
 } // namespace
 
-EventList::EventList(const DriveModel& model, const Clock& clock) : _model(model), _clock(clock) {
+EventList::EventList(const DriveModel& model, const Clock& clock) : _model(&model), _clock(clock) {
     _grid.setColumns(eventColumns());
     _grid.setAccessibleName("Events");
     _grid.setPlaceholder("No event so far.");
@@ -32,8 +32,14 @@ EventList::EventList(const DriveModel& model, const Clock& clock) : _model(model
 
 EventList::~EventList() = default;
 
+void EventList::setModel(const DriveModel& model) {
+    _model = &model;
+    _revision = model.eventsRevision();
+    fill();
+}
+
 void EventList::update() {
-    if (std::exchange(_revision, _model.eventsRevision()) != _model.eventsRevision())
+    if (std::exchange(_revision, _model->eventsRevision()) != _model->eventsRevision())
         fill();
 }
 
@@ -41,7 +47,7 @@ void EventList::fill() {
     SeverityFilter filter{};
     for (std::size_t i = 0; i < filter.size(); ++i)
         filter[i] = _filters[i]->isOn();
-    EventRows made = eventRows(_model.events(), filter, _clock);
+    EventRows made = eventRows(_model->events(), filter, _clock, mostRows);
     _times = std::move(made.times);
     _grid.setRows(std::move(made.rows));
 }

@@ -16,11 +16,15 @@ namespace velmora {
 /// The events of a drive, the newest first, with a button for each severity that lists it or not.
 class EventList final : public View {
 public:
-    /// Both must outlive it.
+    /// Of more events only the newest are listed.
+    static constexpr std::size_t mostRows = 5000;
+
+    /// Both must outlive it, until another model takes the model's place.
     EventList(const DriveModel& model, const Clock& clock);
     ~EventList() override;
 
     void setOnChoose(std::function<void(Time)> choose) { _choose = std::move(choose); }
+    void setModel(const DriveModel& model);
     void update();
     [[nodiscard]] double heightOfRows(std::size_t rows) const;
     void layoutSubviews() override;
@@ -28,7 +32,7 @@ public:
 private:
     void fill();
 
-    const DriveModel& _model;
+    const DriveModel* _model;
     const Clock& _clock;
     GridView _grid;
     std::vector<std::unique_ptr<Button>> _filters;

@@ -31,11 +31,14 @@ std::string eventText(const Event& event) {
            (event.lasts && !event.end ? " (lasts)" : "");
 }
 
-EventRows eventRows(const std::deque<Event>& events, const SeverityFilter& filter, const Clock& clock) {
+EventRows eventRows(const std::deque<Event>& events, const SeverityFilter& filter, const Clock& clock,
+                    std::size_t most) {
     EventRows made;
     for (const Event& each : events) {
         if (!filter[static_cast<std::size_t>(each.severity)])
             continue;
+        if (made.rows.size() == most)
+            break;
         const std::string text = eventText(each);
         made.rows.push_back({{clockText(each.time, clock), {}, Color::automatic, {}},
                              {std::string(nameOf(each.severity)), {}, colorOf(each.severity), {}},

@@ -21,12 +21,12 @@ using SeverityFilter = std::array<bool, 3>;
 [[nodiscard]] std::vector<GridColumn> eventColumns();
 /// "handover: PCI 62 on EARFCN 6300 to PCI 17 on EARFCN 6300".
 [[nodiscard]] std::string eventText(const Event& event);
-/// The events that the filter lets through, in their order, and which ones these are.
+/// The first events that the filter lets through, in their order, and which ones these are.
 struct EventRows {
     std::vector<GridRow> rows;
     std::vector<Time> times; ///< of the rows
 };
 [[nodiscard]] EventRows eventRows(const std::deque<Event>& events, const SeverityFilter& filter,
-                                  const Clock& clock);
+                                  const Clock& clock, std::size_t most);
 
 } // namespace velmora

@@ -50,7 +50,11 @@ Result<std::unique_ptr<PlaybackController>> PlaybackController::open(const Model
 PlaybackController::PlaybackController(const ModelPlatform& platform, std::string path,
                                        std::string technology, Host host)
     : _platform(platform), _path(std::move(path)), _technology(std::move(technology)), _host(std::move(host)),
-      _bar(playbackSpeedTitles()), _speed(normalPlaybackSpeed) {
+      _bar(playbackSpeedTitles()),
+      _drive(_platform.clock, _host.rules,
+             {[this](Time time) { seekToTime(time + 1ns); }, [this] { static_cast<void>(reopen()); },
+              [this] { return progress(); }}),
+      _speed(normalPlaybackSpeed) {
     PlaybackBar::Actions actions;
     actions.command = [this](PlaybackBar::Command command) { run(command); };
     actions.seek = [this](double part) {
@@ -86,11 +90,11 @@ Result<Done> PlaybackController::load() {
     if (!player)
         return Failure{player.reason()};
     // What refers to another goes first.
+    _drive.setPlayer(nullptr, nullptr);
     _player = *std::move(player);
-    _events.reset();
     _index = *std::move(index);
-    _events.emplace(_index->decoder().decoder());
     _file = *std::move(file);
+    _drive.setPlayer(_index.get(), _player.get());
     _technology = _index->technology();
     _tree.clear();
     _reading = _platform.queue.repeating(readInterval, [this] { readOn(); });
@@ -111,13 +115,13 @@ void PlaybackController::readOn() {
     if (_index->isComplete())
         return;
     static_cast<void>(inTime([this] { return !_index->read(messagesAtOnce); }));
+    _drive.changed();
     if (_wanted && (_index->isComplete() || _index->messages() >= *_wanted)) {
         _player->seekToMessage(*std::exchange(_wanted, std::nullopt));
         moved();
     }
     if (_index->isComplete()) {
         _reading.reset();
-        _events->finish();
         _host.noticeChanged();
     }
     showBar();
@@ -156,6 +160,7 @@ void PlaybackController::playOn() {
     }
     checkFile();
     _tree.clear();
+    _drive.changed();
     showBar();
     _host.displayChanged();
 }
@@ -167,6 +172,7 @@ void PlaybackController::moved() {
     _playedSince = _platform.clock.now();
     checkFile();
     _tree.clear();
+    _drive.changed();
     showBar();
     _host.displayChanged();
 }
@@ -205,21 +211,22 @@ void PlaybackController::run(PlaybackBar::Command command) {
         _player->stepToNextRefresh();
         moved();
         break;
-    case Command::EarlierEvent: seekToEvent(_events->before(shownTime())); break;
+    case Command::EarlierEvent: seekToEvent(_drive.recorded().before(shownTime())); break;
     case Command::NextEvent:
         // At the front, those at the time of the first message are still to come.
-        seekToEvent(_events->after(position == 0 ? shownTime() - 1ns : shownTime()));
+        seekToEvent(_drive.recorded().after(position == 0 ? shownTime() - 1ns : shownTime()));
         break;
     case Command::PlayOrPause: break;
     }
 }
 
-void PlaybackController::seekToEvent(const PlaybackEvents::Found* event) {
+void PlaybackController::seekToEvent(const Event* event) {
     if (!event)
         return;
+    std::string text = event->kind + ": " + event->text;
     // After the messages of that time.
-    seekToTime(event->time + std::chrono::nanoseconds(1));
-    _event = event->text;
+    seekToTime(event->time + 1ns);
+    _event = std::move(text);
     _host.noticeChanged();
 }
 

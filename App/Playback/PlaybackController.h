@@ -4,9 +4,9 @@
 #pragma once
 
 #include "App/Playback/MomentTree.h"
+#include "App/Playback/PlayedDrive.h"
 #include "Model/VelmoraModel.h"
 #include "Model/VelmoraModelNode.h"
-#include "Playback/PlaybackEvents.h"
 #include "Playback/Player.h"
 #include "Toolkit/Bars/PlaybackBar.h"
 #include "Toolkit/Notice.h"
@@ -29,6 +29,7 @@ public:
         std::function<void()> displayChanged;
         std::function<void()> noticeChanged;
         PlayedDecoder::Masking masking;
+        DriveModel::RuleFiles rules; ///< of events
     };
 
     /// Opens the file, which plays from its front on; a snapshot is shown at its end. `technology`: of a file
@@ -40,6 +41,8 @@ public:
     PlaybackController& operator=(const PlaybackController&) = delete;
 
     [[nodiscard]] PlaybackBar& bar() { return _bar; }
+    /// What the drive view shows.
+    [[nodiscard]] PlayedDrive& drive() { return _drive; }
     /// The display tree of the moment; null before the first message.
     [[nodiscard]] NodeRef topLevelNodes();
     [[nodiscard]] NodeRef nodeAtPath(const std::string& path);
@@ -70,7 +73,7 @@ private:
     void playOn();
     void run(PlaybackBar::Command command);
     /// Null for none.
-    void seekToEvent(const PlaybackEvents::Found* event);
+    void seekToEvent(const Event* event);
     void setSpeed(std::size_t index);
     /// The moment has changed by a move of the user's, or playing begins from it.
     void moved();
@@ -86,8 +89,8 @@ private:
     PlaybackBar _bar;
     std::unique_ptr<PlayedFile> _file;
     std::unique_ptr<RecordingIndex> _index;
-    std::optional<PlaybackEvents> _events; ///< of the index's decoder
     std::unique_ptr<Player> _player;
+    PlayedDrive _drive;              ///< of the index and the player
     std::unique_ptr<Timer> _reading; ///< while the index is not complete
     std::unique_ptr<Timer> _playing; ///< while it plays
     std::size_t _speed;

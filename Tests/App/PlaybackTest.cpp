@@ -3,7 +3,6 @@
 
 #include "Tests/App/PlaybackFixture.h"
 
-#include "App/DriveView/DriveScreen.h"
 #include "Model/Snapshot.h"
 
 #include <QDropEvent>
@@ -254,21 +253,6 @@ TEST_F(PlaybackScreenTest, ADroppedFileIsShownUntilItIsClosed) {
     EXPECT_EQ(app.playback(), nullptr);
     EXPECT_EQ(part("velmora.playback"), nullptr);
     EXPECT_EQ(shownBand(), "still live");
-}
-
-TEST_F(PlaybackScreenTest, ClosesTheDriveViewWhichShowsWhatIsReceived) {
-    app.setBeginsWithDrive(true);
-    openPaused(write("a.pcapng", fiveBands()));
-    for (const int width : {360, 800}) {
-        window()->resize(width, 640);
-        runUntilIdle();
-        EXPECT_FALSE(app.drive().isShown()) << width;
-        QTest::keyClick(window(), Qt::Key_D, Qt::ControlModifier);
-        EXPECT_FALSE(app.drive().isShown()) << width;
-    }
-    QTest::keyClick(window(), Qt::Key_W, Qt::ControlModifier);
-    runUntilIdle();
-    EXPECT_TRUE(app.drive().isShown());
 }
 
 TEST_F(PlaybackScreenTest, FitsAPhoneAndAWideWindow) {

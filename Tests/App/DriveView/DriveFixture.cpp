@@ -21,7 +21,7 @@ namespace velmora {
 DriveFixture::DriveFixture() {
     setResources(&_files);
     technology = kVoxLogChannelTechnology_Ostrel_GSM;
-    for (const char* const name : {"rules/classes.toml", "rules/coverage.toml"}) {
+    for (const char* const name : {"rules/classes.toml", "rules/coverage.toml", "rules/transfer.toml"}) {
         const Data rules = shippedResource(name);
         platform.rules.push_back({name, std::string(rules.bytes().begin(), rules.bytes().end()), 0, true});
     }
