@@ -119,6 +119,7 @@ void ContextsDetector::report(const MessageReport& report, const RadioPicture& p
     if (!hasList(report.observed))
         return;
     readList(report.observed);
+    _hasRead = true;
     if (_isKnown) {
         compare(report, picture, sink);
         return;

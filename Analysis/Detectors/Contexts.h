@@ -20,11 +20,16 @@ public:
     /// A phone has at most 11 (3GPP TS 24.008 10.5.6.2); further ones of a message are left out.
     static constexpr std::size_t most = 64;
 
-    ContextsDetector(const Catalogue& catalogue, const DetectorTable& table)
-        : _table(table.contexts), _leaves(catalogue) {}
+    /// What the first list has: no events, or contexts that have become active.
+    enum class AtStart : bool { Known, Events };
+
+    ContextsDetector(const Catalogue& catalogue, const DetectorTable& table, AtStart atStart = AtStart::Known)
+        : _table(table.contexts), _leaves(catalogue), _isKnown(atStart == AtStart::Events) {}
 
     [[nodiscard]] bool wants(const CatalogueField& leaf) const override;
     void report(const MessageReport& report, const RadioPicture& picture, EventSink& sink) override;
+    /// Whether there has been a list.
+    [[nodiscard]] bool hasRead() const { return _hasRead; }
     void interrupt(Time last, EventSink& sink) override;
 
 private:
@@ -51,7 +56,8 @@ private:
 
     ContextTable _table;
     LeafRows _leaves;
-    bool _isKnown = false;
+    bool _isKnown;
+    bool _hasRead = false;
     std::vector<Context> _active;
     std::vector<Context> _new; ///< of this message; the storage is used again
     std::size_t _count = 0;    ///< of those in use

@@ -8,6 +8,7 @@
 
 #include <cstdint>
 #include <memory>
+#include <optional>
 #include <string_view>
 
 namespace velmora {
@@ -22,7 +23,8 @@ enum class ReportChart : std::uint8_t { None, Level, Quality, DataRate, ErrorRat
 struct ChartedLeaf {
     const CatalogueField* leaf;
     ReportChart chart;
-    bool isNeighbour; ///< of the rows of a message the best one alone is shown
+    bool isNeighbour;                   ///< of the rows of a message the best one alone is shown
+    std::optional<std::uint32_t> input; ///< whose values these are, where two are compared
     SeriesBuckets buckets;
 };
 

@@ -4,14 +4,15 @@
 #pragma once
 
 #include "Analysis/MessageReport.h"
+#include "Export/Report/MessageRange.h"
 
 #include <cstddef>
 #include <vector>
 
 namespace velmora {
 
-/// Which messages reported the least and the greatest number of each leaf first, so that statistics lead back
-/// to messages.
+/// Which messages reported the least and the greatest number of each leaf first, and between which messages
+/// it was reported, so that statistics lead back to messages.
 class LeafExtremes {
 public:
     struct Extremes {
@@ -38,6 +39,18 @@ public:
         known.isKnown = true;
     }
 
+    /// Of a value of any kind.
+    void addMessage(const Observation& observation, MessageNumber message) {
+        const std::size_t index = observation.leaf->index;
+        if (index >= _ranges.size())
+            _ranges.resize(index + 1);
+        _ranges[index].add(message);
+    }
+    /// Unknown where the leaf reported no value.
+    [[nodiscard]] MessageRange range(const CatalogueField& leaf) const {
+        return leaf.index < _ranges.size() ? _ranges[leaf.index] : MessageRange();
+    }
+
     /// Null where the leaf reported no number.
     [[nodiscard]] const Extremes* find(const CatalogueField& leaf) const {
         return leaf.index < _extremes.size() && _extremes[leaf.index].isKnown ? &_extremes[leaf.index]
@@ -45,6 +58,7 @@ public:
     }
 
 private:
+    std::vector<MessageRange> _ranges;
     std::vector<Extremes> _extremes; ///< by the leaf's index in its catalogue
 };
 

@@ -32,7 +32,7 @@ void ReportEvents::happened(const Event& event) {
     item.severity = event.severity;
     item.kind = numberOf(event.kind);
     item.technology = numberOf(event.technology);
-    item.text = numberOf(textOf(event));
+    item.text = numberOf(shownText(event));
     item.evidence = event.evidence;
 }
 
@@ -45,7 +45,7 @@ std::uint32_t ReportEvents::numberOf(std::string_view name) {
     return number;
 }
 
-std::string ReportEvents::textOf(const Event& event) const {
+std::string ReportEvents::shownText(const Event& event) const {
     if (_hasIdentities)
         return event.text;
     const EventKindRow* const row = eventKindNamed(event.kind);

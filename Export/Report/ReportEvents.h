@@ -41,6 +41,8 @@ public:
         : _hasIdentities(hasIdentities), _ruleTexts(std::move(ruleTexts)) {}
 
     void happened(const Event& event) override;
+    /// The event's text, without identities where the page has none.
+    [[nodiscard]] std::string shownText(const Event& event) const;
     /// Sorts them by their begin, those of the same time by kind. Call it before the following.
     void finish();
 
@@ -57,7 +59,6 @@ public:
 
 private:
     [[nodiscard]] std::uint32_t numberOf(std::string_view name);
-    [[nodiscard]] std::string textOf(const Event& event) const;
 
     bool _hasIdentities;
     std::map<std::string, std::string, std::less<>> _ruleTexts;

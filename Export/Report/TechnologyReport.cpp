@@ -15,7 +15,7 @@ namespace velmora {
 TechnologyReport::TechnologyReport(const Catalogue& catalogue, const LevelClasses* classes,
                                    StatisticsGroups& groups, ReportEvents& events)
     : _classes(classes), _engine(catalogue, events), _statistics(catalogue, groups),
-      _isByFile(groups.plan().by == StatisticsPlan::By::File) {}
+      _isByFile(groups.plan().by == StatisticsPlan::By::File), _events(events) {}
 
 const TechnologyReport::Use& TechnologyReport::useOf(const CatalogueField& leaf) {
     if (leaf.index >= _uses.size())
@@ -24,8 +24,11 @@ const TechnologyReport::Use& TechnologyReport::useOf(const CatalogueField& leaf)
     if (!use.isKnown) {
         use.isKnown = true;
         use.role = leaf.role;
-        if (const ReportChart chart = chartOf(leaf); chart != ReportChart::None)
-            use.series = &_series.emplace_back(ChartedLeaf{&leaf, chart, isNeighbour(leaf), SeriesBuckets()});
+        const ReportChart chart = chartOf(leaf);
+        for (std::uint32_t group = 0; chart != ReportChart::None && group < (_isByFile ? 2 : 1); ++group)
+            use.series[group] = &_series.emplace_back(
+                ChartedLeaf{&leaf, chart, isNeighbour(leaf), _isByFile ? std::optional(group) : std::nullopt,
+                            SeriesBuckets()});
     }
     return use;
 }
@@ -41,11 +44,28 @@ std::chrono::nanoseconds TechnologyReport::pass(Time time) {
     return passed;
 }
 
+void TechnologyReport::beginInput() {
+    if (_isByFile && _last)
+        endBands(*_last);
+    _lastMessage.reset();
+    // Of files that follow each other the first has what there was at the start.
+    if (_isByFile || _startContexts.empty())
+        _startContexts.emplace_back(catalogue(), _events);
+}
+
 void TechnologyReport::report(const MessageReport& report) {
+    if (!_lastMessage || _lastMessage->input != report.message.input)
+        beginInput();
     const std::chrono::nanoseconds passed = pass(report.time);
-    if (passed.count() > 0)
-        _shares[_isByFile ? report.message.input : 0].add(_engine.picture().technology(), _class, passed);
+    if (passed.count() > 0) {
+        MessageRange messages;
+        messages.add(_lastMessage.value_or(report.message));
+        messages.add(report.message);
+        _shares[groupOf(report.message)].add(_engine.picture().technology(), _class, passed, messages);
+    }
+    _lastMessage = report.message;
     _engine.report(report);
+    _startContexts.back().report(report, _engine.picture());
     classify();
     _statistics.report(report);
     _cells.report(report, _engine.picture(), passed);
@@ -55,11 +75,14 @@ void TechnologyReport::report(const MessageReport& report) {
 
 void TechnologyReport::observe(const MessageReport& report) {
     bool hasNeighbour = false;
-    LeafExtremes& extremes = _extremes[_isByFile ? report.message.input : 0];
+    const std::size_t group = groupOf(report.message);
+    LeafExtremes& extremes = _extremes[group];
     for (const Observation& each : report.observed.observations) {
         const Use& use = useOf(*each.leaf);
         hasNeighbour = hasNeighbour || use.role == Role::NeighbourChannel ||
                        use.role == Role::NeighbourPhysicalCell || use.role == Role::NeighbourLevel;
+        if (each.kind != ObservedKind::Absent)
+            extremes.addMessage(each, report.message);
         if (each.kind != ObservedKind::Number || !std::isfinite(each.number))
             continue;
         extremes.add(each, report.message);
@@ -67,13 +90,13 @@ void TechnologyReport::observe(const MessageReport& report) {
             _cells.addLevel(each.number);
         else if (use.role == Role::ServingQuality)
             _cells.addQuality(each.number);
-        if (use.series && !use.series->isNeighbour)
-            use.series->buckets.add(report.time, each.number, report.message);
+        if (ChartedLeaf* const series = use.series[group]; series && !series->isNeighbour)
+            series->buckets.add(report.time, each.number, report.message);
     }
     if (!hasNeighbour)
         return;
     for (ChartedLeaf& series : _series) {
-        if (!series.isNeighbour)
+        if (!series.isNeighbour || series.input.value_or(0) != group)
             continue;
         const Observation* best = nullptr;
         for (const Observation& each : report.observed.observations)
@@ -108,29 +131,34 @@ void TechnologyReport::setBands(const MessageReport& report) {
     const auto nameOfAny = [](const auto& value) {
         return value ? std::optional<std::string_view>(nameOf(*value)) : std::nullopt;
     };
-    _technologyBand.set(report.time, nameOfAny(picture.technology()));
-    _modeBand.set(report.time, nameOfAny(picture.mode()));
-    _radioBand.set(report.time, textOf(Role::RadioState));
-    _registrationBand.set(report.time, textOf(Role::RegistrationState));
-    _classBand.set(report.time, nameOfAny(_class));
+    Bands& bands = _bands[groupOf(report.message)];
+    bands.technology.set(report.time, nameOfAny(picture.technology()));
+    bands.mode.set(report.time, nameOfAny(picture.mode()));
+    bands.radio.set(report.time, textOf(Role::RadioState));
+    bands.registration.set(report.time, textOf(Role::RegistrationState));
+    bands.levelClass.set(report.time, nameOfAny(_class));
     // By number: what is known of a cell, and so its name, grows while it serves.
     if (_cells.number() == _bandCell)
         return;
     _bandCell = _cells.number();
     if (_bandCell == ServingCells::unknown)
-        _cellBand.end(report.time);
+        bands.cell.end(report.time);
     else if (_bandCell == ServingCells::further)
-        _cellBand.set(report.time, "further cells");
+        bands.cell.set(report.time, "further cells");
     else
-        _cellBand.set(report.time, std::to_string(_bandCell));
+        bands.cell.set(report.time, std::to_string(_bandCell));
+}
+
+void TechnologyReport::endBands(Time time) {
+    for (Bands& bands : _bands)
+        for (StateBand* const band : bands.all())
+            band->end(time);
+    _bandCell = ServingCells::unknown;
 }
 
 void TechnologyReport::forget(Time time) {
-    for (StateBand* const band :
-         {&_technologyBand, &_classBand, &_modeBand, &_radioBand, &_registrationBand, &_cellBand})
-        band->end(time);
+    endBands(time);
     _cells.interrupt();
-    _bandCell = ServingCells::unknown;
     _last.reset();
 }
 
@@ -165,17 +193,21 @@ void TechnologyReport::finish() {
         each.buckets.finish();
     std::erase_if(_series, [](const ChartedLeaf& each) { return each.buckets.isEmpty(); });
     _uses.clear(); // which lead to them
-    for (std::size_t i = 0; i < _cells.size(); ++i)
-        _cellBand.rename(std::to_string(i + 1), nameOf(_cells.identity(i)));
+    for (Bands& bands : _bands)
+        for (std::size_t i = 0; i < _cells.size(); ++i)
+            bands.cell.rename(std::to_string(i + 1), nameOf(_cells.identity(i)));
 }
 
-std::vector<const StateBand*> TechnologyReport::bands() const {
-    std::vector<const StateBand*> bands;
-    for (const StateBand* const band :
-         {&_technologyBand, &_classBand, &_modeBand, &_radioBand, &_registrationBand, &_cellBand})
-        if (!band->isEmpty())
-            bands.push_back(band);
-    return bands;
+std::vector<TechnologyReport::ShownBand> TechnologyReport::bands() const {
+    std::vector<ShownBand> shown;
+    for (std::uint32_t group = 0; group < _bands.size(); ++group) {
+        const Bands& bands = _bands[group];
+        for (const StateBand* const band : {&bands.technology, &bands.levelClass, &bands.mode, &bands.radio,
+                                            &bands.registration, &bands.cell})
+            if (!band->isEmpty())
+                shown.push_back({band, _isByFile ? std::optional(group) : std::nullopt});
+    }
+    return shown;
 }
 
 } // namespace velmora

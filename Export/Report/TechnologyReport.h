@@ -10,6 +10,7 @@
 #include "Export/Report/ChartedLeaf.h"
 #include "Export/Report/LeafExtremes.h"
 #include "Export/Report/NeighbourRows.h"
+#include "Export/Report/StartContexts.h"
 #include "Export/Report/StateBand.h"
 #include "Export/Report/TimeShares.h"
 
@@ -55,21 +56,44 @@ public:
     [[nodiscard]] const TimeShares& shares(std::size_t group) const { return _shares[group]; }
     /// Those that have values.
     [[nodiscard]] const std::deque<ChartedLeaf>& series() const { return _series; }
-    [[nodiscard]] std::vector<const StateBand*> bands() const;
+    struct ShownBand {
+        const StateBand* band;
+        std::optional<std::uint32_t> input; ///< whose states these are, where two are compared
+    };
+    [[nodiscard]] std::vector<ShownBand> bands() const;
+    /// Of the inputs one after the other.
+    [[nodiscard]] const std::deque<StartContexts>& startContexts() const { return _startContexts; }
 
 private:
     /// How a leaf's observations are used.
     struct Use {
         bool isKnown = false;
         Role role = Role::None;
-        ChartedLeaf* series = nullptr;
+        std::array<ChartedLeaf*, 2> series{}; ///< by group
+    };
+    struct Bands {
+        StateBand technology{"radio technology"};
+        StateBand levelClass{"level class"};
+        StateBand mode{"mode"};
+        StateBand radio{"radio state"};
+        StateBand registration{"registration"};
+        StateBand cell{"serving cell"};
+
+        [[nodiscard]] std::array<StateBand*, 6> all() {
+            return {&technology, &levelClass, &mode, &radio, &registration, &cell};
+        }
     };
 
     [[nodiscard]] const Use& useOf(const CatalogueField& leaf);
+    /// The group of the message's input, see `extremes`.
+    [[nodiscard]] std::size_t groupOf(MessageNumber message) const { return _isByFile ? message.input : 0; }
+    /// The next message is the first of an input.
+    void beginInput();
     [[nodiscard]] std::chrono::nanoseconds pass(Time time);
     void observe(const MessageReport& report);
     void classify();
     void setBands(const MessageReport& report);
+    void endBands(Time time);
     void forget(Time time);
 
     const LevelClasses* _classes;
@@ -82,17 +106,15 @@ private:
     std::array<TimeShares, 2> _shares;
     std::vector<Use> _uses; ///< by the leaf's index
     std::deque<ChartedLeaf> _series;
-    StateBand _technologyBand{"radio technology"};
-    StateBand _modeBand{"mode"};
-    StateBand _radioBand{"radio state"};
-    StateBand _classBand{"level class"};
-    StateBand _registrationBand{"registration"};
-    StateBand _cellBand{"serving cell"};
-    std::uint32_t _bandCell = ServingCells::unknown; ///< the cell's number, in that band
+    std::array<Bands, 2> _bands;                     ///< by group
+    std::uint32_t _bandCell = ServingCells::unknown; ///< the cell's number, in its band
+    std::deque<StartContexts> _startContexts;
+    const ReportEvents& _events;
     std::optional<LevelClass> _class;                ///< of the serving cell's level
     std::optional<RadioTechnology> _classTechnology; ///< that it is for
     std::optional<double> _classLevel;
     std::optional<Time> _last; ///< of the latest message; absent after an interruption
+    std::optional<MessageNumber> _lastMessage;
 };
 
 } // namespace velmora

@@ -5,6 +5,7 @@
 
 #include "Analysis/Classes/LevelClass.h"
 #include "Analysis/Picture/RadioTechnology.h"
+#include "Export/Report/MessageRange.h"
 
 #include <array>
 #include <chrono>
@@ -22,29 +23,39 @@ public:
     static constexpr std::size_t noClass = classes;
 
     void add(std::optional<RadioTechnology> technology, std::optional<LevelClass> levelClass,
-             std::chrono::nanoseconds time) {
+             std::chrono::nanoseconds time, const MessageRange& messages) {
         const std::size_t row = technology ? static_cast<std::size_t>(*technology) : noTechnology;
-        _times[row][levelClass ? static_cast<std::size_t>(*levelClass) : noClass] += time;
+        Share& share = _shares[row][levelClass ? static_cast<std::size_t>(*levelClass) : noClass];
+        share.time += time;
+        share.messages.add(messages);
     }
 
     [[nodiscard]] std::chrono::nanoseconds time(std::size_t technology, std::size_t levelClass) const {
-        return _times[technology][levelClass];
+        return _shares[technology][levelClass].time;
+    }
+    /// The first and the last messages of that time.
+    [[nodiscard]] const MessageRange& messages(std::size_t technology, std::size_t levelClass) const {
+        return _shares[technology][levelClass].messages;
     }
     [[nodiscard]] std::chrono::nanoseconds ofTechnology(std::size_t technology) const {
         std::chrono::nanoseconds sum{0};
-        for (const std::chrono::nanoseconds each : _times[technology])
-            sum += each;
+        for (const Share& each : _shares[technology])
+            sum += each.time;
         return sum;
     }
     [[nodiscard]] std::chrono::nanoseconds total() const {
         std::chrono::nanoseconds sum{0};
-        for (std::size_t i = 0; i < _times.size(); ++i)
+        for (std::size_t i = 0; i < _shares.size(); ++i)
             sum += ofTechnology(i);
         return sum;
     }
 
 private:
-    std::array<std::array<std::chrono::nanoseconds, classes + 1>, radioTechnologies + 1> _times{};
+    struct Share {
+        std::chrono::nanoseconds time{0};
+        MessageRange messages;
+    };
+    std::array<std::array<Share, classes + 1>, radioTechnologies + 1> _shares{};
 };
 
 } // namespace velmora

@@ -35,7 +35,7 @@ function unpackSeries(packed) {
     }
     const leastAt = summed(packed.minimumAtSteps);
     return {
-        name: packed.path, technology: packed.technology, chart: packed.chart, unit: packed.unit,
+        name: packed.path, file: packed.file, technology: packed.technology, chart: packed.chart, unit: packed.unit,
         isBest: packed.best, width: packed.width, begin, least, greatest, count: packed.count, leastAt,
         greatestAt: leastAt.map((value, i) => value + packed.maximumAtOffset[i]),
     };
@@ -50,7 +50,7 @@ function unpackBand(packed) {
         since[i] = time += packed.steps[2 * i];
         value[i] = packed.steps[2 * i + 1];
     }
-    return { name: packed.name, technology: packed.technology, values: packed.values, since, value };
+    return { name: packed.name, file: packed.file, technology: packed.technology, values: packed.values, since, value };
 }
 
 function unpackEvents(packed) {
@@ -68,7 +68,7 @@ function unpackEvents(packed) {
     };
 }
 
-// The number of a message of all files, as the page writes it: "#12", of several files "2:#12".
+// The number of a message of all files, as the page writes it: "#12", of several files "#2:12".
 function messageName(number) {
     if (data.files.length === 1) return "#" + number;
     let file = data.files.length - 1;

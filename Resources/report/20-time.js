@@ -30,6 +30,18 @@ function two(number) {
     return String(number).padStart(2, "0");
 }
 
+// "0:01:05" since the begin of the files that lie over each other.
+function sinceText(time, hasMilliseconds) {
+    const ms = Math.max(Math.round(time - spans[0].begin), 0);
+    const text = Math.floor(ms / 3600000) + ":" + two(Math.floor(ms / 60000) % 60) + ":" + two(Math.floor(ms / 1000) % 60);
+    return hasMilliseconds ? text + "." + String(ms % 1000).padStart(3, "0") : text;
+}
+
+// A time of the charts' axis.
+function axisText(time) {
+    return isOverlaid ? sinceText(time, true) + " since the start" : momentText(time);
+}
+
 function dayText(time) {
     const date = new Date(time);
     return isLocal
@@ -72,8 +84,9 @@ function timeTicks(from, to, most) {
         const begin = Math.max(span.begin, timeAt(Math.max(from, span.place)));
         if (span.place > to || span.place + span.end - span.begin < from) continue;
         const end = Math.min(span.end, span.begin + to - span.place);
-        const shift = isLocal ? -60000 * new Date(begin).getTimezoneOffset() : 0;
-        for (let time = Math.ceil((begin + shift) / step) * step - shift; time <= end; time += step)
+        const zone = isLocal ? -60000 * new Date(begin).getTimezoneOffset() : 0;
+        const shifted = isOverlaid ? -spans[0].begin : zone;
+        for (let time = Math.ceil((begin + shifted) / step) * step - shifted; time <= end; time += step)
             ticks.push({ time, place: placeOf(time), step });
     }
     return ticks;

@@ -188,10 +188,10 @@ function drawAxis(panel, view) {
     let day = "";
     for (const tick of timeTicks(view.from, view.to, (width - leftMargin) / 110)) {
         const at = x(tick.place);
-        const text = clockText(tick.time, tick.step < 1000);
+        const text = isOverlaid ? sinceText(tick.time, tick.step < 1000) : clockText(tick.time, tick.step < 1000);
         context.fillRect(at, 0, 1, 5);
         if (at - 24 < free) continue;
-        const isNewDay = dayText(tick.time) !== day;
+        const isNewDay = !isOverlaid && dayText(tick.time) !== day;
         day = dayText(tick.time);
         context.fillText(text, at - 22, 17);
         if (isNewDay) context.fillText(day, at - 22, 31);

@@ -51,7 +51,7 @@ function setCursor(place, doesShow) {
     for (const call of whenCursorMoves) call();
 }
 
-// Shows that time, close enough to see what happened.
+// Shows that time of the axis, close enough to see what happened.
 function goTo(time, duration) {
     const place = placeOf(time);
     const length = Math.min(view.to - view.from, Math.max(120000, 2 * (duration || 0)));

@@ -56,7 +56,7 @@ function addChart(name, rows) {
         one.isShown = true;
         const box = element("input", { type: "checkbox", checked: true });
         box.addEventListener("change", () => { one.isShown = box.checked; redraw(); });
-        const label = one.name + (one.isBest ? " (best)" : "");
+        const label = nameWithFile(one.name, one.file) + (one.isBest ? " (best)" : "");
         legend.append(element("li", {}, element("label", {}, box, element("span", { className: "dot d-" + one.colour }),
             " ", label)));
         const row = addReadout(label, one.unit, one.colour);
@@ -79,9 +79,13 @@ function addChart(name, rows) {
         element("div", { className: "heading" }, element("h3", { textContent: title }), legend));
 }
 
+function bandPlace(band) {
+    return bands.findIndex((other) => other.name === band.name);
+}
+
 function addBand(band, rows) {
-    const name = bands.some((other) => other !== band && other.name === band.name)
-        ? band.name + ", " + band.technology : band.name;
+    const isOne = bands.every((other) => other === band || other.name !== band.name || other.file !== band.file);
+    const name = nameWithFile(isOne ? band.name : band.name + ", " + band.technology, band.file);
     addPanel(name, 16, drawBand, { band }, element("h3", { textContent: name }));
     rows.append(addReadout(name, ""));
     const out = readouts[readouts.length - 1];
@@ -100,16 +104,18 @@ function showCursor() {
     cursorLine.style.transform = "translateX(" + x + "px)";
     const time = timeAt(cursor);
     for (const each of readouts) each.update(time);
-    document.getElementById("cursor-time").textContent = momentText(time);
+    document.getElementById("cursor-time").textContent = axisText(time);
 }
 
 function showRange() {
-    range.textContent = momentText(timeAt(view.from)) + " \u2013 " + momentText(timeAt(view.to)) + " ("
+    stage.dataset.length = String(view.to - view.from); // ms
+    range.textContent = axisText(timeAt(view.from)) + " \u2013 " + axisText(timeAt(view.to)) + " ("
         + spanText(view.to - view.from) + ")";
 }
 
 function makeStage() {
     const live = document.getElementById("live");
+    makeComparison();
     range = element("p", { className: "range" });
     const tools = element("div", { className: "buttons", role: "toolbar" },
         button("+", "Zoom in", () => zoom(0.5)), button("\u2212", "Zoom out", () => zoom(2)),
@@ -123,7 +129,8 @@ function makeStage() {
     stage.setAttribute("aria-describedby", "stage-help");
     const rows = element("tbody", {});
     for (const name of ["level", "quality", "data rate", "error rate"]) addChart(name, rows);
-    for (const band of bands) addBand(band, rows);
+    // Those of two files next to each other.
+    for (const band of bands.slice().sort((a, b) => bandPlace(a) - bandPlace(b))) addBand(band, rows);
     if (events.count) addPanel("events", 16, drawTicks, {}, element("h3", { textContent: "events" }));
     addPanel("time", 34, drawAxis, {});
     const selection = element("div", { className: "selection", hidden: true });

@@ -24,7 +24,8 @@ function eventRow(at) {
     const index = listed[at];
     const duration = events.duration[index];
     const row = element("div", { className: "event s-" + severities[events.severity[index]], id: "event-" + index },
-        element("span", { className: "when", textContent: clockText(events.time[index], true)
+        element("span", { className: "when", textContent: (isComparison ? fileLetters[events.file[index]] + " " : "")
+            + clockText(realTime(events.time[index], events.file[index]), true)
             + (duration > 0 ? ", " + spanText(duration) : duration === -1 ? ", no end" : "") }),
         element("span", { className: "kind", textContent: events.names[events.kind[index]] }),
         element("span", { className: "what", textContent: events.names[events.text[index]] }),

@@ -17,7 +17,13 @@ function unpackTrack(packed) {
     const south = least(latitude);
     const north = greatest(latitude);
     const narrowing = Math.max(Math.cos((((north + south) / 2) * Math.PI) / 180), 0.01);
-    return { time, latitude, longitude, isBegin, north, south, west: least(longitude), east: greatest(longitude), narrowing };
+    // Of two files: where the second one's fixes begin.
+    let second = time.findIndex((each) => fileOfTime(each) === 1);
+    if (second < 0) second = time.length;
+    const file = new Uint8Array(time.length);
+    if (isOverlaid) for (let i = second; i < time.length; ++i) { file[i] = 1; time[i] -= shift; }
+    const parts = isOverlaid ? [[0, second], [second, time.length]] : [[0, time.length]];
+    return { time, file, parts, latitude, longitude, isBegin, north, south, west: least(longitude), east: greatest(longitude), narrowing };
 }
 
 // From red over yellow to green, as levels are.
@@ -26,30 +32,40 @@ function valueColour(part) {
     return palette[names[Math.min(3, Math.max(0, Math.floor(part * 4)))]];
 }
 
+// What that file has of the same field or state; undefined where it has none.
+function ofFile(all, one, file) {
+    if (one.file === undefined) return one;
+    return all.find((each) => each.name === one.name && each.technology === one.technology && each.isBest === one.isBest
+        && each.file === file);
+}
+
 // The function that gives a time its colour, and what it says below the track.
 function colouring() {
     const choice = track.choice.value;
     if (choice === "") return { of: () => palette.series[0], text: "" };
     if (choice[0] === "b") {
-        const band = bands[Number(choice.slice(1))];
+        const chosenBand = bands[Number(choice.slice(1))];
         return {
             text: "",
-            of: (time) => {
+            of: (time, file) => {
+                const band = ofFile(bands, chosenBand, file);
+                if (!band) return palette.none;
                 const at = upperBound(band.since, time) - 1;
                 return at < 0 || band.value[at] === 0 ? palette.none : bandColour(band, band.value[at]);
             },
         };
     }
     const one = series[Number(choice.slice(1))];
-    const values = one.least.map((value, i) => (value + one.greatest[i]) / 2);
-    const sorted = values.slice().sort();
+    const both = [0, 1].map((file) => ofFile(series, one, file));
+    const middles = both.map((each) => each && each.least.map((value, i) => (value + each.greatest[i]) / 2));
+    const sorted = Float64Array.from(both[0] === both[1] || !middles[1] ? middles[0] || [] : [...(middles[0] || []), ...middles[1]]).sort();
     const low = sorted[Math.floor(sorted.length * 0.02)];
     const high = sorted[Math.floor((sorted.length - 1) * 0.98)];
     return {
         text: "from " + Number(low.toFixed(2)) + " (red) to " + Number(high.toFixed(2)) + " " + one.unit + " (green)",
-        of: (time) => {
-            const at = seriesAt(one, time);
-            return at < 0 ? palette.none : valueColour((values[at] - low) / (high - low || 1));
+        of: (time, file) => {
+            const at = both[file] ? seriesAt(both[file], time) : -1;
+            return at < 0 ? palette.none : valueColour((middles[file][at] - low) / (high - low || 1));
         },
     };
 }
@@ -95,7 +111,7 @@ function drawTrack() {
     for (let i = 1; i < track.time.length; ++i) {
         if (track.isBegin[i]) { end(); continue; }
         const isShown = track.time[i] >= from && track.time[i] <= to;
-        const next = isShown ? of(track.time[i]) : palette.line;
+        const next = isShown ? of(track.time[i], isComparison ? fileOfFix(i) : 0) : palette.line;
         if (!isOpen || next !== colour) {
             end();
             colour = next;
@@ -113,35 +129,44 @@ function drawTrack() {
     moveMarker();
 }
 
-function fixAt(time) {
-    const at = upperBound(track.time, time) - 1;
-    if (at < 0) return -1;
-    const isNext = at + 1 < track.time.length && track.time[at + 1] - time < time - track.time[at];
-    const near = isNext ? at + 1 : at;
-    return Math.abs(track.time[near] - time) <= 10000 ? near : -1;
+function fileOfFix(i) {
+    return isOverlaid ? track.file[i] : fileOfTime(track.time[i]);
+}
+
+// The fix next to a time; of files that lie over each other that file's.
+function fixAt(time, file) {
+    const [begin, end] = track.parts[isOverlaid ? file || 0 : 0];
+    const at = begin + upperBound(track.time.subarray(begin, end), time) - 1;
+    const next = at + 1 < end && (at < begin || track.time[at + 1] - time < time - track.time[at]) ? at + 1 : at;
+    return next >= begin && Math.abs(track.time[next] - time) <= 10000 ? next : -1;
 }
 
 function drawCellChanges(context, map, from, to) {
-    const band = bands.find((each) => each.name === "serving cell");
-    if (!band || !track.cells.checked) return;
+    if (!track.cells.checked) return;
     context.fillStyle = palette.ink;
-    for (let i = 1; i < band.since.length; ++i) {
-        if (band.since[i] < from || band.since[i] > to || band.value[i] === 0) continue;
-        const at = fixAt(band.since[i]);
-        if (at < 0) continue;
-        context.beginPath();
-        context.arc(map.x(at), map.y(at), 3, 0, 2 * Math.PI);
-        context.fill();
+    for (const band of bands) {
+        if (band.name !== "serving cell") continue;
+        for (let i = 1; i < band.since.length; ++i) {
+            if (band.since[i] < from || band.since[i] > to || band.value[i] === 0) continue;
+            const at = fixAt(band.since[i], band.file);
+            if (at < 0) continue;
+            context.beginPath();
+            context.arc(map.x(at), map.y(at), 3, 0, 2 * Math.PI);
+            context.fill();
+        }
     }
 }
 
 function moveMarker() {
-    const at = cursor === null ? -1 : fixAt(timeAt(cursor));
-    track.marker.hidden = at < 0;
-    if (at < 0) return;
     const map = trackScale();
-    track.marker.style.transform = "translate(" + (map.x(at) - 8) + "px," + (map.y(at) - 8) + "px)";
-    track.place.textContent = track.latitude[at].toFixed(5) + ", " + track.longitude[at].toFixed(5);
+    const places = track.markers.map((marker, file) => {
+        const at = cursor === null ? -1 : fixAt(timeAt(cursor), file);
+        marker.hidden = at < 0;
+        if (at < 0) return "";
+        marker.style.transform = "translate(" + (map.x(at) - 8) + "px," + (map.y(at) - 8) + "px)";
+        return nameWithFile(track.latitude[at].toFixed(5) + ", " + track.longitude[at].toFixed(5), isOverlaid ? file : undefined);
+    });
+    if (places.some((place) => place)) track.place.textContent = places.filter((place) => place).join("; ");
 }
 
 // The place of the track that is nearest to a point moves the cursor.
@@ -161,8 +186,11 @@ function goToPoint(event) {
 function makeTrack() {
     if (!data.track || !data.track.timeSteps.length) return;
     track = unpackTrack(data.track);
-    const levels = series.map((one, i) => ["s" + i, one.name]);
-    const states = bands.map((band, i) => ["b" + i, band.name]);
+    // Of two files' ones for both.
+    const isFirst = (all) => (one) => one.file === undefined || all.find((each) =>
+        each.name === one.name && each.technology === one.technology && each.isBest === one.isBest) === one;
+    const levels = series.filter(isFirst(series)).map((one) => ["s" + series.indexOf(one), one.name]);
+    const states = bands.filter(isFirst(bands)).map((band) => ["b" + bands.indexOf(band), band.name]);
     const options = [...levels, ...states, ["", "nothing"]];
     track.choice = element("select", {}, ...options.map(([value, textContent]) => element("option", { value, textContent })));
     const level = series.findIndex((one) => one.chart === "level" && !one.isBest);
@@ -171,10 +199,10 @@ function makeTrack() {
     track.canvas = element("canvas", {});
     track.canvas.setAttribute("aria-hidden", "true");
     track.canvas.style.height = trackHeight + "px";
-    track.marker = element("div", { className: "marker", hidden: true });
+    track.markers = track.parts.map(() => element("div", { className: "marker", hidden: true }));
     track.legend = element("span", {});
     track.place = element("span", { className: "m" });
-    const map = element("div", { className: "map" }, track.canvas, track.marker);
+    const map = element("div", { className: "map" }, track.canvas, ...track.markers);
     map.addEventListener("click", goToPoint);
     for (const control of [track.choice, track.cells]) control.addEventListener("change", drawTrack);
     document.getElementById("live-track").append(

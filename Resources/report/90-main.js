@@ -23,7 +23,7 @@ function makeZoneSwitch() {
 function linkTimes() {
     for (const time of document.querySelectorAll("#events td time, #contexts td time, #summary td time, #cells td time, #neighbours td time")) {
         const go = button("", "Show in the charts", () => {
-            goTo(Date.parse(time.dateTime), 60000);
+            goTo(shownTime(Date.parse(time.dateTime)), 60000);
             document.getElementById("charts").scrollIntoView();
         });
         go.className = "go";

@@ -18,6 +18,7 @@ import subprocess
 import sys
 import tempfile
 import time
+from collections.abc import Callable
 from pathlib import Path
 
 from positions import expect, finish, need, run, sentence
@@ -65,6 +66,21 @@ class Receiver:
         self.process.wait()
 
 
+def wait_until(what: str, holds: Callable[[], bool]) -> None:
+    until = time.monotonic() + 60
+    while not holds():
+        if time.monotonic() > until:
+            raise SystemExit(f"{what} did not come")
+        time.sleep(0.1)
+
+
+def fixes_of(recording: Path) -> int:
+    """So far; the recorder may be writing its last block."""
+    ended = subprocess.run([str(LOG), "info", "--format", "json", str(recording)], capture_output=True, text=True, check=False)
+    positions = json.loads(ended.stdout).get("positions") if ended.stdout else None
+    return int(positions["fixes"]) if positions else 0
+
+
 with tempfile.TemporaryDirectory() as temporary:
     directory = Path(temporary)
     os.environ["VELMORA_PORT_DIR"] = str(directory / "ports")
@@ -75,18 +91,25 @@ with tempfile.TemporaryDirectory() as temporary:
                                stderr=subprocess.DEVNULL)
     receiver = Receiver(nmea, port)
     receiver.wait_for(port)
-    recorder = subprocess.Popen([str(LOG), "record", "--gps", f"gpsd:127.0.0.1:{port}", "--duration", "16", str(recording)],
-                                stderr=subprocess.PIPE, text=True)
+    log = directory / "errors"
+    with log.open("w", encoding="utf-8") as out:
+        recorder = subprocess.Popen([str(LOG), "record", "--gps", f"gpsd:127.0.0.1:{port}", str(recording)], stderr=out)
     try:
-        time.sleep(6)
+        wait_until("ten fixes", lambda: fixes_of(recording) >= 10)
         receiver.end()
-        time.sleep(2)
+        wait_until("the loss", lambda: "is gone" in log.read_text(encoding="utf-8"))
+        before = fixes_of(recording)
         receiver = Receiver(nmea, port)
-        errors = recorder.communicate(timeout=60)[1]
+        wait_until("ten more fixes", lambda: fixes_of(recording) >= before + 10)
+        recorder.send_signal(signal.SIGINT)
+        recorder.wait(timeout=60)
     finally:
         receiver.end()
+        recorder.kill()
+        recorder.wait()
         service.terminate()
         service.wait()
+    errors = log.read_text(encoding="utf-8")
     expect(recorder.returncode == 0, f"record: status {recorder.returncode}: {errors}")
     expect(f"gpsd at 127.0.0.1:{port} is gone" in errors, f"the loss is not said: {errors}")
     expect(f"gpsd at 127.0.0.1:{port} is there" in errors, f"that it is back is not said: {errors}")

@@ -123,10 +123,10 @@ void writeData(Markup& out, const DriveReport& report, const TimeAxis& axis) {
     out.raw("],\n\"bands\":[");
     isFirst = true;
     for (const auto& technology : report.technologies())
-        for (const StateBand* const band : technology->bands()) {
+        for (const TechnologyReport::ShownBand& band : technology->bands()) {
             out.raw(isFirst ? "\n" : ",\n");
             isFirst = false;
-            writeBandData(out, technology->catalogue().technology(), *band, base);
+            writeBandData(out, technology->catalogue().technology(), band, base);
         }
     if (!report.track().isEmpty()) {
         out.raw("],\n\"track\":");

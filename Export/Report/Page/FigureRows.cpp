@@ -11,6 +11,7 @@ namespace velmora {
 
 void FigureRows::Row::add(const TechnologyReport& technology, const CatalogueField& leaf) {
     for (std::size_t i = 0; i < extremes.size(); ++i) {
+        messages[i].add(technology.extremes(i).range(leaf));
         const LeafExtremes::Extremes* const other = technology.extremes(i).find(leaf);
         if (!other)
             continue;
@@ -35,7 +36,7 @@ FigureRows::FigureRows(Markup& out, const DriveReport& report, std::string_view 
     : _out(out), _report(report) {
     beginTable(out, caption,
                {"What", "File", "Unit", "#Samples", "#Minimum", "#5 %", "#50 %", "#95 %", "#Maximum", "#Mean",
-                "Messages of the extremes"});
+                "Messages", "Messages of the extremes"});
 }
 
 FigureRows::~FigureRows() {
@@ -62,6 +63,7 @@ void FigureRows::writeRow(const Row& row, std::size_t input) {
     for (const auto& each :
          {figures.minimum, figures.p5, figures.p50, figures.p95, figures.maximum, figures.mean})
         writeNumberCell(_out, each ? pageFigure(*each) : "");
+    writeRange(_out, _report, row.messages[input]);
     _out.raw("<td>");
     if (const LeafExtremes::Extremes& known = row.extremes[input]; known.isKnown) {
         writeMessage(_out, _report, known.minimumAt);
@@ -88,7 +90,7 @@ void FigureRows::writeDifference(const Row& row) {
     writeOne(a.p95, b.p95);
     writeOne(a.maximum, b.maximum);
     writeOne(a.mean, b.mean);
-    _out.raw("<td></td></tr>\n");
+    _out.raw("<td></td><td></td></tr>\n");
 }
 
 bool hasFigures(Role role) {

@@ -29,8 +29,9 @@ public:
         Unit unit = Unit::None;
         std::array<std::optional<NumberFigures>, 2> figures; ///< by input
         std::array<LeafExtremes::Extremes, 2> extremes;
+        std::array<MessageRange, 2> messages; ///< of all samples
 
-        /// Considers the leaf's extremes.
+        /// Considers the leaf's extremes and messages.
         void add(const TechnologyReport& technology, const CatalogueField& leaf);
     };
 

@@ -11,6 +11,8 @@
 #include <array>
 #include <cmath>
 #include <limits>
+#include <optional>
+#include <string>
 #include <vector>
 
 namespace velmora {
@@ -39,6 +41,11 @@ std::vector<Column> columnsOf(const SeriesBuckets& series, const TimeAxis& axis)
         column.maximum = std::max(column.maximum, bucket.maximum);
     }
     return result;
+}
+
+/// "before.pcapng: " of a comparison.
+std::string fileText(const DriveReport& report, std::optional<std::uint32_t> input) {
+    return input ? report.inputs()[*input].name + ": " : std::string();
 }
 
 void writeSeries(Markup& out, const ChartedLeaf& series, std::size_t colour, const TimeAxis& axis,
@@ -79,7 +86,9 @@ void writeChart(Markup& out, const DriveReport& report, ReportChart chart, const
     out.text(nameOf(series.front()->leaf->unit)).raw(")<ul class=\"legend\">");
     for (std::size_t i = 0; i < series.size(); ++i) {
         out.raw("<li><svg width=\"14\" height=\"10\" aria-hidden=\"true\"><path class=\"l-").number(i % 8);
-        out.raw("\" d=\"M0 5H14\"/></svg> ").text(series[i]->leaf->path);
+        out.raw("\" d=\"M0 5H14\"/></svg> ")
+            .text(fileText(report, series[i]->input))
+            .text(series[i]->leaf->path);
         out.raw(series[i]->isNeighbour ? " (best)</li>" : "</li>");
     }
     out.raw("</ul></figcaption>\n<svg class=\"plot\" viewBox=\"0 0 1000 140\" role=\"img\" aria-label=\"");
@@ -116,11 +125,11 @@ void writeBandLegend(Markup& out, const StateBand& band) {
 }
 
 /// The band in columns, each with the value in its middle; neighbours of one value are one rectangle.
-void writeBand(Markup& out, const StateBand& band, const TimeAxis& axis) {
-    out.raw("<figure class=\"band\"><figcaption>").text(band.name());
+void writeBand(Markup& out, const StateBand& band, const std::string& file, const TimeAxis& axis) {
+    out.raw("<figure class=\"band\"><figcaption>").text(file).text(band.name());
     writeBandLegend(out, band);
     out.raw("</figcaption><svg class=\"plot\" viewBox=\"0 0 1000 16\" role=\"img\" aria-label=\"");
-    out.text(band.name()).raw(" over time\">");
+    out.text(file).text(band.name()).raw(" over time\">");
     std::size_t step = 0;
     const auto& steps = band.steps();
     double begin = margin;
@@ -192,8 +201,8 @@ void writePictures(Markup& out, const DriveReport& report, const TimeAxis& axis)
     for (const auto& technology : report.technologies()) {
         if (report.technologies().size() > 1)
             out.raw("<h3>").text(technology->catalogue().technology()).raw("</h3>\n");
-        for (const StateBand* const band : technology->bands())
-            writeBand(out, *band, axis);
+        for (const TechnologyReport::ShownBand& shown : technology->bands())
+            writeBand(out, *shown.band, fileText(report, shown.input), axis);
     }
     writeTicks(out, report, axis);
     out.raw("</div></section>\n");

@@ -39,6 +39,17 @@ void writeMessage(Markup& out, const DriveReport& report, MessageNumber message)
     out.number(message.number).raw("</span>");
 }
 
+void writeRange(Markup& out, const DriveReport& report, const MessageRange& messages) {
+    out.raw("<td>");
+    if (messages.isKnown)
+        writeMessage(out, report, messages.first);
+    if (messages.isKnown && messages.last != messages.first) {
+        out.raw(" – ");
+        writeMessage(out, report, messages.last);
+    }
+    out.raw("</td>");
+}
+
 void writeTime(Markup& out, Time time) {
     out.raw("<time datetime=\"").raw(pageStamp(time)).raw("\">").raw(pageTime(time)).raw("</time>");
 }

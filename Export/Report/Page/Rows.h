@@ -4,6 +4,7 @@
 #pragma once
 
 #include "Analysis/MessageReport.h"
+#include "Export/Report/MessageRange.h"
 #include "Platform/Clock.h"
 
 #include <initializer_list>
@@ -23,6 +24,8 @@ void writeCell(Markup& out, std::string_view text);
 void writeNumberCell(Markup& out, std::string_view text);
 /// The message's number, which the page's script turns into the place in the charts.
 void writeMessage(Markup& out, const DriveReport& report, MessageNumber message);
+/// A cell with the first and the last message; empty where they are not known.
+void writeRange(Markup& out, const DriveReport& report, const MessageRange& messages);
 void writeTime(Markup& out, Time time);
 
 } // namespace velmora

@@ -82,6 +82,12 @@ void writeValues(Markup& out, const SeriesBuckets& series) {
                 [&](const Bucket& each) { out.number(whole(each.maximum) - whole(each.minimum)); });
 }
 
+/// Of a comparison: whose data it is.
+void writeInput(Markup& out, std::optional<std::uint32_t> input) {
+    if (input)
+        out.raw(",\"file\":").number(*input);
+}
+
 } // namespace
 
 void writeSeriesData(Markup& out, const DriveReport& report, std::string_view technology,
@@ -90,6 +96,7 @@ void writeSeriesData(Markup& out, const DriveReport& report, std::string_view te
         return static_cast<std::int64_t>(report.numbersBefore(message.input) + message.number);
     };
     out.raw("{\"technology\":").string(technology).raw(",\"chart\":").string(nameOf(series.chart));
+    writeInput(out, series.input);
     out.raw(",\"path\":").string(series.leaf->path).raw(",\"role\":").string(nameOf(series.leaf->role));
     out.raw(",\"unit\":").string(nameOf(series.leaf->unit));
     out.raw(",\"best\":").raw(series.isNeighbour ? "true" : "false").raw(",\"width\":");
@@ -107,8 +114,11 @@ void writeSeriesData(Markup& out, const DriveReport& report, std::string_view te
     out.raw("}");
 }
 
-void writeBandData(Markup& out, std::string_view technology, const StateBand& band, std::int64_t base_ms) {
+void writeBandData(Markup& out, std::string_view technology, const TechnologyReport::ShownBand& shown,
+                   std::int64_t base_ms) {
+    const StateBand& band = *shown.band;
     out.raw("{\"technology\":").string(technology).raw(",\"name\":").string(band.name());
+    writeInput(out, shown.input);
     out.raw(",\"values\":[");
     for (std::size_t i = 0; i < band.values().size(); ++i)
         out.raw(i == 0 ? "" : ",").string(band.values()[i]);

@@ -4,7 +4,7 @@
 #pragma once
 
 #include "Export/Report/ChartedLeaf.h"
-#include "Export/Report/StateBand.h"
+#include "Export/Report/TechnologyReport.h"
 
 #include <cstdint>
 #include <string_view>
@@ -18,6 +18,7 @@ class Markup;
 /// times count from.
 void writeSeriesData(Markup& out, const DriveReport& report, std::string_view technology,
                      const ChartedLeaf& series);
-void writeBandData(Markup& out, std::string_view technology, const StateBand& band, std::int64_t base_ms);
+void writeBandData(Markup& out, std::string_view technology, const TechnologyReport::ShownBand& band,
+                   std::int64_t base_ms);
 
 } // namespace velmora

@@ -21,7 +21,7 @@ void writeRoles(Markup& out, const DriveReport& report) {
     for (const RoleName& name : roleNames()) {
         if (!hasFigures(name.role))
             continue;
-        FigureRows::Row row{std::string(nameOf(name.role)), name.unit, {}, {}};
+        FigureRows::Row row{std::string(nameOf(name.role)), name.unit, {}, {}, {}};
         for (std::size_t i = 0; i < report.groups().size(); ++i)
             for (const RoleStatistics& role : rolesOf(*report.groups()[i]))
                 if (role.role == name.role)
@@ -39,7 +39,7 @@ void writeLeaves(Markup& out, const DriveReport& report, const TechnologyReport&
     for (const CatalogueField& leaf : technology.catalogue().fields()) {
         if (isNamingNumber(leaf) || (isIdentifying(leaf) && !report.options().hasIdentities))
             continue;
-        FigureRows::Row row{leaf.path, leaf.unit, {}, {}};
+        FigureRows::Row row{leaf.path, leaf.unit, {}, {}, {}};
         for (const auto& group : report.groups())
             for (const auto& part : group->parts)
                 if (part->technology == technology.catalogue().technology())
@@ -50,7 +50,17 @@ void writeLeaves(Markup& out, const DriveReport& report, const TechnologyReport&
     }
 }
 
-void writeStates(Markup& out, const DriveReport& report, const LeafStatistics& leaf, std::string_view file) {
+/// Between which messages the state was reported.
+MessageRange messagesOf(const DriveReport& report, std::string_view technology, const CatalogueField& leaf,
+                        std::size_t group) {
+    for (const auto& each : report.technologies())
+        if (each->catalogue().technology() == technology)
+            return each->extremes(group).range(leaf);
+    return {};
+}
+
+void writeStates(Markup& out, const DriveReport& report, const LeafStatistics& leaf, std::string_view file,
+                 const MessageRange& messages) {
     const std::chrono::nanoseconds whole = leaf.states.time();
     for (const StateCounts::Value& value : leaf.states.values()) {
         out.raw("<tr>");
@@ -61,22 +71,26 @@ void writeStates(Markup& out, const DriveReport& report, const LeafStatistics& l
         writeNumberCell(out, pageDuration(value.time));
         writeNumberCell(out, pageShare(value.time, whole));
         writeNumberCell(out, pageCount(value.samples));
+        writeRange(out, report, messages);
         out.raw("</tr>\n");
     }
 }
 
 void writeStates(Markup& out, const DriveReport& report) {
     if (report.isComparison())
-        beginTable(out, "Time in states", {"State", "File", "Value", "#Time", "#Share", "#Reports"});
+        beginTable(out, "Time in states",
+                   {"State", "File", "Value", "#Time", "#Share", "#Reports", "Messages"});
     else
-        beginTable(out, "Time in states", {"State", "Value", "#Time", "#Share", "#Reports"});
+        beginTable(out, "Time in states", {"State", "Value", "#Time", "#Share", "#Reports", "Messages"});
     for (const auto& group : report.groups())
         for (const auto& part : group->parts)
             for (const auto& leaf : part->leaves)
                 if (leaf && !leaf->states.values().empty() && !leaf->isInList() &&
                     leaf->leaf.sameAs.empty() && leaf->states.time().count() != 0 &&
                     (!isIdentifying(leaf->leaf) || report.options().hasIdentities))
-                    writeStates(out, report, *leaf, report.inputs()[group->key.input.value_or(0)].name);
+                    writeStates(
+                        out, report, *leaf, report.inputs()[group->key.input.value_or(0)].name,
+                        messagesOf(report, part->technology, leaf->leaf, group->key.input.value_or(0)));
     endTable(out);
 }
 

@@ -4,12 +4,16 @@
 #include "Export/Report/Page/SummaryPart.h"
 
 #include "Export/Report/DriveReport.h"
+#include "Export/Report/MessageRange.h"
 #include "Export/Report/Page/Markup.h"
 #include "Export/Report/Page/Rows.h"
 #include "Export/Report/Page/TrackPart.h"
+#include "Platform/TimeSpan.h"
 
 #include <algorithm>
 #include <array>
+#include <chrono>
+#include <optional>
 
 namespace velmora {
 
@@ -69,13 +73,14 @@ void writeBar(Markup& out, std::chrono::nanoseconds part, std::chrono::nanosecon
     out.raw(name).raw("\" width=\"").point(share * 120).raw("\" height=\"12\"/></svg></td>");
 }
 
-void writeShares(Markup& out, const TechnologyReport& technology, std::size_t group, const std::string& of) {
+void writeShares(Markup& out, const DriveReport& report, const TechnologyReport& technology,
+                 std::size_t group, const std::string& of) {
     const TimeShares& shares = technology.shares(group);
     const std::chrono::nanoseconds whole = shares.total();
     if (whole.count() == 0)
         return;
     beginTable(out, "Time by radio technology and level class: " + of,
-               {"Radio technology", "Level", "#Time", "#Share", "Bar"});
+               {"Radio technology", "Level", "#Time", "#Share", "Bar", "Messages"});
     for (std::size_t row = 0; row <= TimeShares::noTechnology; ++row)
         for (std::size_t i = 0; i <= TimeShares::noClass; ++i) {
             const std::chrono::nanoseconds time = shares.time(row, i);
@@ -88,6 +93,7 @@ void writeShares(Markup& out, const TechnologyReport& technology, std::size_t gr
             writeNumberCell(out, pageDuration(time));
             writeNumberCell(out, pageShare(time, whole));
             writeBar(out, time, whole, className(i));
+            writeRange(out, report, shares.messages(row, i));
             out.raw("</tr>\n");
         }
     endTable(out);
@@ -105,8 +111,27 @@ void writeSeverities(Markup& out, const DriveReport& report) {
     endTable(out);
 }
 
+/// Some of the minute's messages, from the first to the last: those that the charts' buckets lead to.
+MessageRange messagesOf(const DriveReport& report, const RoleStatistics& role,
+                        std::optional<std::uint32_t> input) {
+    MessageRange messages;
+    const Time end = timeAfter(role.worst->begin, std::chrono::minutes(1));
+    for (const auto& technology : report.technologies())
+        for (const ChartedLeaf& each : technology->series()) {
+            if (each.leaf->role != role.role || each.input != input ||
+                technology->catalogue().technology() != role.worstTechnology)
+                continue;
+            for (const SeriesBuckets::Bucket& bucket : each.buckets.buckets())
+                if (const Time begin(bucket.index * each.buckets.width());
+                    begin >= role.worst->begin && begin < end)
+                    messages.add({true, std::min(bucket.minimumAt, bucket.maximumAt),
+                                  std::max(bucket.minimumAt, bucket.maximumAt)});
+        }
+    return messages;
+}
+
 void writeWorstMinutes(Markup& out, const DriveReport& report) {
-    beginTable(out, "Worst minutes", {"What", "Minute", "#Figure", "#Samples", "Decoded as"});
+    beginTable(out, "Worst minutes", {"What", "Minute", "#Figure", "#Samples", "Decoded as", "Messages"});
     for (std::size_t i = 0; i < report.groups().size(); ++i)
         for (const RoleStatistics& role : rolesOf(*report.groups()[i])) {
             if (!role.worst)
@@ -122,6 +147,9 @@ void writeWorstMinutes(Markup& out, const DriveReport& report) {
             writeNumberCell(out, pageFigure(role.worst->figure) + ' ' + std::string(nameOf(role.unit)));
             writeNumberCell(out, pageCount(role.worst->samples));
             writeCell(out, role.worstTechnology);
+            const std::uint32_t input = report.groups()[i]->key.input.value_or(0);
+            writeRange(out, report,
+                       messagesOf(report, role, report.isComparison() ? std::optional(input) : std::nullopt));
             out.raw("</tr>\n");
         }
     endTable(out);
@@ -178,7 +206,7 @@ void writeSummary(Markup& out, const DriveReport& report) {
     out.raw("<h3>Was it good?</h3>\n<div class=\"side\">");
     for (const auto& each : report.technologies())
         for (std::size_t i = 0; i < (report.isComparison() ? 2 : 1); ++i)
-            writeShares(out, *each, i,
+            writeShares(out, report, *each, i,
                         report.isComparison() ? report.inputs()[i].name : each->catalogue().technology());
     writeSeverities(out, report);
     writeWorstMinutes(out, report);

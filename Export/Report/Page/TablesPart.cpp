@@ -21,14 +21,6 @@ void writeFigures(Markup& out, const ValueCounts& values) {
     writeNumberCell(out, pageFigure(values.maximum()));
 }
 
-void writeMessages(Markup& out, const DriveReport& report, MessageNumber first, MessageNumber last) {
-    out.raw("<td>");
-    writeMessage(out, report, first);
-    out.raw(" – ");
-    writeMessage(out, report, last);
-    out.raw("</td>");
-}
-
 void writeCells(Markup& out, const DriveReport& report) {
     out.raw("<section id=\"cells\" aria-labelledby=\"cells-title\"><h2 id=\"cells-title\">Cells seen</h2>\n");
     beginTable(out, "Serving cells",
@@ -50,7 +42,7 @@ void writeCells(Markup& out, const DriveReport& report) {
             writeNumberCell(out, pageCount(row.levels.count()));
             writeFigures(out, row.levels);
             writeFigures(out, row.qualities);
-            writeMessages(out, report, row.firstMessage, row.lastMessage);
+            writeRange(out, report, {true, row.firstMessage, row.lastMessage});
             out.raw("</tr>\n");
         }
     endTable(out);
@@ -81,7 +73,7 @@ void writeNeighbours(Markup& out, const DriveReport& report) {
             out.raw("</td>");
             writeFigures(out, row.levels);
             writeFigures(out, row.qualities);
-            writeMessages(out, report, row.firstMessage, row.lastMessage);
+            writeRange(out, report, {true, row.firstMessage, row.lastMessage});
             out.raw("</tr>\n");
         }
     }
@@ -95,11 +87,30 @@ bool isOfContext(std::string_view kind) {
     return kind == "context-up" || kind == "context-down" || kind == "address-change";
 }
 
+void writeStartContexts(Markup& out, const DriveReport& report) {
+    beginTable(out, "Contexts that were active when their first list came",
+               {"Time", "Decoded as", "Context", "Message"});
+    for (const auto& technology : report.technologies())
+        for (const StartContexts& contexts : technology->startContexts())
+            for (const StartContexts::Row& row : contexts.rows()) {
+                out.raw("<tr><td>");
+                writeTime(out, row.time);
+                out.raw("</td>");
+                writeCell(out, technology->catalogue().technology());
+                writeCell(out, row.text);
+                out.raw("<td>");
+                writeMessage(out, report, row.message);
+                out.raw("</td></tr>\n");
+            }
+    endTable(out);
+}
+
 void writeContexts(Markup& out, const DriveReport& report) {
     const ReportEvents& events = report.events();
     constexpr std::size_t most = 200;
     out.raw("<section id=\"contexts\" aria-labelledby=\"contexts-title\">"
             "<h2 id=\"contexts-title\">Packet-data contexts</h2>\n");
+    writeStartContexts(out, report);
     beginTable(out, "Changes of contexts", {"Time", "Kind", "Context", "Messages"});
     std::size_t rows = 0;
     for (const auto& each : events.items()) {

@@ -2,9 +2,16 @@
 # SPDX-License-Identifier: MIT
 """What the checks ask of a browser."""
 
+import time
 from abc import ABC, abstractmethod
+from collections.abc import Callable
 from pathlib import Path
 from typing import Any
+
+
+# Two frames: what was asked for in the first one is drawn in the second.
+DRAWN = "return new Promise((drawn) => requestAnimationFrame(() => requestAnimationFrame(() => drawn(true))))"
+LONGEST_WAIT_S = 20
 
 
 class Browser(ABC):
@@ -18,6 +25,16 @@ class Browser(ABC):
     @abstractmethod
     def run(self, script: str, *arguments: Any) -> Any:
         """Runs the body of a function in the page and returns its result; waits for promises."""
+
+    def wait_for_drawing(self) -> None:
+        self.run(DRAWN)
+
+    def wait_until(self, holds: Callable[[], object]) -> bool:
+        """Whether it holds, or comes to hold while the page draws."""
+        until = time.monotonic() + LONGEST_WAIT_S
+        while not (found := bool(holds())) and time.monotonic() < until:
+            self.wait_for_drawing()
+        return found
 
     @abstractmethod
     def resize(self, width: int, height: int) -> None: ...
@@ -38,6 +55,11 @@ class Browser(ABC):
 
     @abstractmethod
     def move(self, point: tuple[int, int]) -> None: ...
+
+    def pinch(self, middle: tuple[int, int], begin: int, end: int) -> bool:
+        """Two fingers that far from the middle go to the other distance. False where the driver has no fingers."""
+        del middle, begin, end
+        return False
 
     @abstractmethod
     def click(self, selector: str) -> None: ...
@@ -73,6 +95,19 @@ def pointer_actions(begin: tuple[int, int], end: tuple[int, int] | None, keys: s
     pauses = [pause() for _ in range(len(path) - len(held))]
     return [{"type": "key", "id": "keyboard", "actions": [*held, *pauses, pause(), *released]},
             {"type": "pointer", "id": "mouse", "actions": path}]
+
+
+def pinch_actions(middle: tuple[int, int], begin: int, end: int) -> list[dict[str, Any]]:
+    """Two fingers to the left and the right of the middle."""
+    def finger(name: str, side: int) -> dict[str, Any]:
+        def at(distance: int, duration: int) -> dict[str, Any]:
+            return {"type": "pointerMove", "x": middle[0] + side * distance, "y": middle[1], "duration": duration}
+
+        path = [at(begin, 0), {"type": "pointerDown", "button": 0}, at((begin + end) // 2, 60), at(end, 60),
+                {"type": "pointerUp", "button": 0}]
+        return {"type": "pointer", "id": name, "parameters": {"pointerType": "touch"}, "actions": path}
+
+    return [finger("left", -1), finger("right", 1)]
 
 
 def key_actions(keys: str) -> list[dict[str, Any]]:

@@ -2,7 +2,6 @@
 # SPDX-License-Identifier: MIT
 """What holds for a page in a browser. Each check returns the errors that it finds."""
 
-import time
 from collections.abc import Callable, Iterator
 from pathlib import Path
 
@@ -28,6 +27,7 @@ DRAWN = """return [...document.querySelectorAll('#stage canvas')].filter((canvas
         drawn += isDrawn ? 1 : 0;
     }
     return drawn / (width - left); });"""
+LENGTH = "return Number(document.getElementById('stage')?.dataset.length)"  # of what the charts show, in ms
 GROUND = "return getComputedStyle(document.body).backgroundColor"
 VIOLATIONS = """
 return axe.run(document, { resultTypes: ['violations'] }).then((result) => result.violations.map((each) =>
@@ -35,15 +35,11 @@ return axe.run(document, { resultTypes: ['violations'] }).then((result) => resul
 """
 
 
-def frame() -> None:
-    time.sleep(0.2)
-
-
 def check_start(browser: Browser, page: Path, slowest_ms: int) -> Iterator[str]:
     browser.resize(*WIDE)
     browser.set_dark(False)
     browser.open(page)
-    frame()
+    browser.wait_until(lambda: browser.run(READY))
     ready = browser.run(READY)
     if ready is None:
         yield "its script did not get to its end"
@@ -54,8 +50,13 @@ def check_start(browser: Browser, page: Path, slowest_ms: int) -> Iterator[str]:
 
 
 def check_drawn(browser: Browser) -> Iterator[str]:
-    shares = browser.run(DRAWN)
-    if not shares or min(shares) < 0.2:
+    shares: list[float] = []
+
+    def are_drawn() -> bool:
+        shares[:] = browser.run(DRAWN)
+        return bool(shares) and min(shares) >= 0.2
+
+    if not browser.wait_until(are_drawn):
         yield f"charts are not drawn: {shares} of their columns have a line"
 
 
@@ -68,8 +69,7 @@ def centre(browser: Browser) -> tuple[int, int]:
 def check_changes(browser: Browser, what: str, script: str, action: Callable[[], object]) -> Iterator[str]:
     before = browser.run(script)
     action()
-    frame()
-    if browser.run(script) == before:
+    if not browser.wait_until(lambda: browser.run(script) != before):
         yield f"{what} changes nothing: {before}"
 
 
@@ -95,7 +95,8 @@ def check_events(browser: Browser) -> Iterator[str]:
         yield "no events are listed"
         return
     browser.run("document.querySelectorAll('.event')[2].click()")
-    frame()
+    browser.wait_until(lambda: browser.run("return document.querySelector('.event[aria-selected=true]') !== null"))
+    browser.wait_for_drawing()
     chosen, when = browser.run("const row = document.querySelector('.event[aria-selected=true]');"
                                "return [row !== null, row && row.querySelector('.when').textContent.slice(0, 12)]")
     if not chosen:
@@ -107,6 +108,14 @@ def check_events(browser: Browser) -> Iterator[str]:
 def check_touch(browser: Browser) -> Iterator[str]:
     if "pan-y" not in browser.run("return getComputedStyle(document.getElementById('stage')).touchAction"):
         yield "fingers do not reach the charts"
+    x, y = centre(browser)
+    for what, begin, end, sign in (("fingers that move apart", 60, 240, -1), ("fingers that come together", 240, 60, 1)):
+        before = browser.run(LENGTH)
+        if not browser.pinch((x, y), begin, end):
+            return
+        if not browser.wait_until(lambda sign=sign, before=before:  # type: ignore[misc]
+                                  (browser.run(LENGTH) - before) * sign > 0):
+            yield f"{what} do not zoom: {before} ms before, {browser.run(LENGTH)} after"
 
 
 def check_zone(browser: Browser) -> Iterator[str]:
@@ -118,7 +127,7 @@ def check_zone(browser: Browser) -> Iterator[str]:
 
 def check_width(browser: Browser, size: tuple[int, int]) -> Iterator[str]:
     browser.resize(*size)
-    frame()
+    browser.wait_for_drawing()
     inner, scroll = browser.run("return [innerWidth, document.documentElement.scrollWidth]")
     if inner != size[0]:
         yield f"the window is {inner} wide, wanted {size[0]}"
@@ -159,6 +168,40 @@ def check_page(browser: Browser, page: Path, axe: str | None, slowest_ms: int) -
     yield from check_width(browser, NARROW)
     yield from check_accessible(browser, axe, "dark and narrow")
     yield from check_print(browser)
+    yield from browser.problems()
+
+
+def check_comparison(browser: Browser, page: Path, lengths_ms: tuple[int, int]) -> Iterator[str]:
+    """The charts of two files lie over each other, from the start of each, or one after the other."""
+    yield from check_start(browser, page, 60_000)
+    yield from check_drawn(browser)
+    length = browser.run(LENGTH)
+    if abs(length - max(lengths_ms)) > 1:
+        yield f"over each other the charts are {length} ms long, wanted the longer of {lengths_ms}"
+    if "since the start" not in browser.run(RANGE):
+        yield f"over each other the charts show {browser.run(RANGE)}"
+    names = browser.run("return [...document.querySelectorAll('.legend label')].map((each) => each.textContent.trim())")
+    for letter in "AB":
+        if not any(name.startswith(letter + ": ") for name in names):
+            yield f"no series of file {letter}: {names}"
+    # Where both have values, the table below the charts has them, too.
+    x, y = centre(browser)
+    left = x - browser.run(STAGE + "return box.width / 2") + 58
+    shorter = left + (browser.run(STAGE + "return box.width") - 58) * min(lengths_ms) / max(lengths_ms)
+    browser.move((int((left + shorter) / 2), y))
+    read = browser.run("return [...document.querySelectorAll('#readout tbody tr')].map((row) =>"
+                       "[row.querySelector('th').textContent.trim(), row.querySelector('td').textContent])")
+    for letter in "AB":
+        if not any(name.startswith(letter + ": ") and value != "\u2013" for name, value in read):
+            yield f"at the same time since the start file {letter} has nothing: {read}"
+    chosen = "[...document.querySelectorAll('.event')].find((row) => row.querySelector('.when').textContent.startsWith('B '))"
+    yield from check_changes(browser, "the choice of an event of the second file", CURSOR, lambda: browser.run(chosen + ".click()"))
+    browser.run("document.getElementById('arrangement').click()")
+    if not browser.wait_until(lambda: browser.run(READY) and browser.run(LENGTH) > max(lengths_ms) + 1):
+        yield f"one after the other the charts are {browser.run(LENGTH)} ms long, wanted more than {lengths_ms}"
+    if "UTC" not in browser.run(RANGE):
+        yield f"one after the other the charts show {browser.run(RANGE)}"
+    yield from check_drawn(browser)
     yield from browser.problems()
 
 

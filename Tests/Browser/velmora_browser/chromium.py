@@ -7,13 +7,12 @@ import json
 import shutil
 import subprocess
 import tempfile
-import time
 import urllib.error
 import urllib.request
 from pathlib import Path
 from typing import Any
 
-from .browser import Browser, key_actions, pointer_actions
+from .browser import Browser, key_actions, pinch_actions, pointer_actions
 
 ELEMENT = "element-6066-11e4-a52e-4f735466cecf"
 
@@ -73,7 +72,7 @@ class Chromium(Browser):
 
     def _act(self, actions: list[dict[str, Any]]) -> None:
         self._call("POST", "/actions", {"actions": actions})
-        time.sleep(0.15)  # a frame, in which the page draws
+        self.wait_for_drawing()
 
     def press(self, keys: str) -> None:
         self._act(key_actions(keys))
@@ -84,10 +83,14 @@ class Chromium(Browser):
     def move(self, point: tuple[int, int]) -> None:
         self._act(pointer_actions(point, None, ""))
 
+    def pinch(self, middle: tuple[int, int], begin: int, end: int) -> bool:
+        self._act(pinch_actions(middle, begin, end))
+        return True
+
     def click(self, selector: str) -> None:
         found = self._call("POST", "/element", {"using": "css selector", "value": selector})
         self._call("POST", f"/element/{found[ELEMENT]}/click", {})
-        time.sleep(0.15)
+        self.wait_for_drawing()
 
     def screenshot(self) -> bytes:
         return base64.b64decode(self._call("GET", "/screenshot"))

@@ -106,20 +106,23 @@ class Firefox(Browser):
         # The page alone: a window is no narrower than its toolbar.
         self._call("WebDriver:SetWindowRect", {"width": 1400, "height": height + 200})
         self._in_chrome(PAGE_SIZE, width, height)
-        time.sleep(0.3)
+        self.wait_until(lambda: self.run("return innerWidth === arguments[0]", width))
+        self.wait_for_drawing()
 
     def set_dark(self, dark: bool) -> None:
         self._in_chrome("Services.prefs.setIntPref(arguments[0], arguments[1])",
                         "layout.css.prefers-color-scheme.content-override", DARK if dark else LIGHT)
-        time.sleep(0.3)
+        self.wait_until(lambda: self.run("return matchMedia('(prefers-color-scheme: dark)').matches") == dark)
+        self.wait_for_drawing()
 
     def set_print(self, printed: bool) -> None:
         self._in_chrome(MEDIUM, "print" if printed else "")
-        time.sleep(0.3)
+        self.wait_until(lambda: self.run("return matchMedia('print').matches") == printed)
+        self.wait_for_drawing()
 
     def _act(self, actions: list[dict[str, Any]]) -> None:
         self._call("WebDriver:PerformActions", {"actions": actions})
-        time.sleep(0.15)
+        self.wait_for_drawing()
 
     def press(self, keys: str) -> None:
         self._act(key_actions(keys))
@@ -133,7 +136,7 @@ class Firefox(Browser):
     def click(self, selector: str) -> None:
         found = self._call("WebDriver:FindElement", {"using": "css selector", "value": selector})
         self._call("WebDriver:ElementClick", {"id": next(iter(found.values()))})
-        time.sleep(0.15)
+        self.wait_for_drawing()
 
     def screenshot(self) -> bytes:
         return base64.b64decode(self._call("WebDriver:TakeScreenshot", {"full": False}))

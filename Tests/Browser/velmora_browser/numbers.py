@@ -2,13 +2,17 @@
 # SPDX-License-Identifier: MIT
 """Every number of the page's data, compared with what other commands say of the same recording."""
 
+import html
 import json
+import re
 import subprocess
 from collections import defaultdict
 from collections.abc import Iterator
 from datetime import datetime, timezone
 from pathlib import Path
 from typing import Any
+
+from .static import data_of
 
 FIGURES = ("samples", "minimum", "p5", "p50", "p95", "maximum", "mean")
 
@@ -145,15 +149,59 @@ def check_events(data: dict[str, Any], events: list[dict[str, Any]]) -> Iterator
         yield f"events: got {len(got)}, wanted {len(wanted)}; first difference {difference}"
 
 
-def check_numbers(program: Path, recording: Path, data: dict[str, Any]) -> Iterator[str]:
+ROW = re.compile(r"<tr><td>([^<]*)</td><td>[^<]*</td><td>[^<]*</td><td class=\"n\">([^<]*)</td>(?:<td class=\"n\">[^<]*</td>){6}"
+                 r"<td>([^\n]*?)</td><td>([^\n]*?)</td></tr>")
+NUMBER = re.compile(r"#(\d+)")
+
+
+def check_ranges(page: str, samples: list[dict[str, Any]]) -> Iterator[str]:
+    """The figures of a field name the first and the last message that reported it, and those of its extremes."""
+    values: dict[str, list[tuple[int, float]]] = defaultdict(list)
+    for sample in samples:
+        if isinstance(sample["value"], int | float) and not isinstance(sample["value"], bool):
+            values[pattern(sample["path"])].append((sample["record"], sample["value"]))
+    found = 0
+    for name, count, messages, extremes in ROW.findall(page):
+        reported = values.get(html.unescape(name))
+        if not reported:
+            continue
+        found += 1
+        records = [record for record, _ in reported]
+        wanted = [min(records), max(records)] if min(records) != max(records) else [records[0]]
+        got = [int(number) for number in NUMBER.findall(messages)]
+        if got != wanted or int(count.replace(",", "")) != len(reported):
+            yield f"{name}: {count} samples in messages {got}, wanted {len(reported)} in {wanted}"
+        values_at = dict(reported)
+        least, greatest = (int(number) for number in NUMBER.findall(extremes))
+        if least not in values_at or greatest not in values_at:
+            yield f"{name}: the messages of the extremes, {least} and {greatest}, did not report it"
+    if found < 3:
+        yield f"only {found} fields have figures with messages"
+
+
+def check_shares(page: str, messages: int) -> Iterator[str]:
+    """Each share of time has its messages, of which one share has the first of all and one the last."""
+    table = page.partition("<caption>Time by radio technology and level class")[2].partition("</table>")[0]
+    rows = table.partition("<tbody>")[2].split("</tr>")[:-1]
+    ranges = [[int(number) for number in NUMBER.findall(row)] for row in rows]
+    if not rows or not all(ranges) or any(numbers != sorted(numbers) for numbers in ranges):
+        yield f"the shares of time have the messages {ranges}"
+    elif min(numbers[0] for numbers in ranges) > 20 or max(numbers[-1] for numbers in ranges) < messages - 20:
+        yield f"the shares of time have the messages {ranges}, of {messages}"
+
+
+def check_numbers(program: Path, recording: Path, page: str) -> Iterator[str]:
     """For a page of one recording whose numbers are its own."""
+    data = data_of(page)
     samples = objects(program, "decode", "--samples", "--format", "jsonl", recording)
     stats = document(program, "stats", "--format", "json", recording)[0]
     yield from check_series(data, samples, stats)
     yield from check_roles(data, stats)
+    yield from check_ranges(page, samples)
     yield from check_cells(data, document(program, "stats", "--by", "cell", "--format", "json", recording))
     yield from check_events(data, objects(program, "events", "--format", "jsonl", recording))
     info = document(program, "info", "--format", "json", recording)
     messages = sum(technology["messages"] for each in info for technology in each.get("technologies", []))
+    yield from check_shares(page, messages)
     if data["files"][0]["messages"] != messages:
         yield f"messages: got {data['files'][0]['messages']}, wanted {messages}"

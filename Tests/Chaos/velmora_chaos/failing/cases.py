@@ -6,6 +6,7 @@ from velmora_chaos.failing.case import Case
 from velmora_chaos.failing.columns_case import ColumnsCase
 from velmora_chaos.failing.convert_case import ConvertCase
 from velmora_chaos.failing.record_case import RecordCase
+from velmora_chaos.failing.report_case import ReportCase
 from velmora_chaos.failing.save_case import SaveCase
 from velmora_chaos.sandbox import RECORDINGS
 
@@ -37,6 +38,8 @@ def all_cases() -> list[Case]:
         ConvertCase("c2k.pcapng", "drive.dlf", had=True),
         ConvertCase("gsm.pcapng", "drive.velmora", had=False),
         ConvertCase("gsm.pcapng", "drive.velmora", had=True),
+        ReportCase("gsm.pcapng", had=False),
+        ReportCase("lte.pcapng", had=True),
         RecordCase(False, "some messages", count),
         RecordCase(True, "some messages", count),
         RecordCase(False, "a while", ["--duration", "1.3"]),
