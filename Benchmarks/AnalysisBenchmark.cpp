@@ -106,11 +106,13 @@ private:
 
 void columnsOfADrive(benchmark::State& state) {
     Setting setting(state);
+    const AllCatalogues catalogues;
+    const RuleSet rules = loadBuiltInRules(catalogues);
     WorkContext context("drive");
     for (auto step : state) {
         NoOutputs outputs;
-        InputColumns columns({}, outputs);
-        ColumnsObserver observer(columns);
+        InputColumns columns({}, rules, outputs);
+        ColumnsObserver observer(columns, setting.reader, nullptr);
         setting.reader.rewind();
         if (!decodeMessages(setting.reader, {}, context, observer) || !columns.finish({}))
             std::abort();

@@ -13,7 +13,7 @@ test_packages=(libgtest-dev libgmock-dev librapidcheck-dev libbenchmark-dev nloh
     gdal-bin libxml2-utils clang-format-14
     fonts-dejavu-core xvfb dbus at-spi2-core gir1.2-atspi-2.0 python3-gi desktop-file-utils appstream
     modemmanager shellcheck reuse git lintian fakeroot file systemd python3-jsonschema mandoc bash-completion
-    mypy chromium chromium-driver firefox-esr weston qt6-wayland)
+    mypy python3-pandas python3-dask python3-distributed procps chromium chromium-driver firefox-esr weston qt6-wayland)
 # shellcheck disable=SC2034
 fuzz_packages=(clang libclang-rt-14-dev)
 # shellcheck disable=SC2034

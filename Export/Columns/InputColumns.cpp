@@ -4,8 +4,10 @@
 #include "Export/Columns/InputColumns.h"
 
 #include "Export/Columns/FilesTable.h"
+#include "Export/Columns/PositionsTable.h"
 
 #include <algorithm>
+#include <utility>
 
 namespace velmora {
 
@@ -17,12 +19,39 @@ constexpr std::size_t textBytesBetween = std::size_t{1} << 20;
 
 } // namespace
 
-InputColumns::InputColumns(InputFile file, TableOutputs& outputs)
-    : _file(std::move(file)), _outputs(outputs) {}
+InputColumns::InputColumns(InputFile file, const RuleSet& rules, TableOutputs& outputs)
+    : _file(std::move(file)), _rules(rules), _outputs(outputs) {}
 
 TechnologyTables& InputColumns::add(const Catalogue& catalogue) {
+    if (!_positions) {
+        const std::string technology(catalogue.technology());
+        _positions.emplace(positionsTable::layout(technology), _file.hash,
+                           _outputs.open("positions", technology), _compressor);
+        for (const Fix& fix : std::exchange(_early, {}))
+            positionsTable::add(*_positions, fix);
+    }
     return *_technologies.emplace_back(
-        std::make_unique<TechnologyTables>(catalogue, _file.hash, _message, _outputs, _compressor));
+        std::make_unique<TechnologyTables>(catalogue, _rules, _file.hash, _message, _outputs, _compressor));
+}
+
+void InputColumns::add(const Fix& fix) {
+    if (!_positions) {
+        _early.push_back(fix);
+        return;
+    }
+    positionsTable::add(*_positions, fix);
+    if (_positions->size() > mostOfTable)
+        note(_positions->cut());
+}
+
+void InputColumns::addNote(std::uint64_t message, std::string_view text) {
+    if (_current)
+        _current->events().noted(message, text);
+}
+
+void InputColumns::addLoss(std::uint64_t message, std::string_view reason) {
+    for (const std::unique_ptr<TechnologyTables>& technology : _technologies)
+        technology->events().damaged(message, reason);
 }
 
 void InputColumns::select(std::string_view technology) {
@@ -51,7 +80,7 @@ void InputColumns::willDecode(const CurrentMessage& message) {
 }
 
 void InputColumns::limitMemory() {
-    std::size_t sum = 0;
+    std::size_t sum = limitOthers();
     std::vector<std::pair<std::size_t, TableWriter*>> sizes;
     for (const std::unique_ptr<TechnologyTables>& technology : _technologies)
         for (TableWriter& table : technology->tables()) {
@@ -72,6 +101,18 @@ void InputColumns::limitMemory() {
     }
 }
 
+/// The same of tables that are not of messages. Returns the bytes of memory that they take.
+std::size_t InputColumns::limitOthers() {
+    std::size_t sum = _positions ? _positions->size() : 0;
+    for (const std::unique_ptr<TechnologyTables>& technology : _technologies) {
+        InputTable& events = technology->events().table();
+        if (events.size() > mostOfTable)
+            note(events.cut());
+        sum += events.size();
+    }
+    return sum;
+}
+
 void InputColumns::note(const Result<Done>& result) {
     if (!result && !_failure)
         _failure = Failure{result.reason()};
@@ -83,6 +124,10 @@ Result<Done> InputColumns::finish(const InputFile& file) {
         for (TableWriter& table : technology->tables())
             note(table.finish());
     for (const std::unique_ptr<TechnologyTables>& technology : _technologies)
+        note(technology->events().finish());
+    if (_positions)
+        note(_positions->finish());
+    for (const std::unique_ptr<TechnologyTables>& technology : _technologies)
         note(writeFilesTable(file, *technology, _outputs, _compressor));
     if (_failure)
         return *_failure;
@@ -90,17 +135,19 @@ Result<Done> InputColumns::finish(const InputFile& file) {
 }
 
 std::size_t InputColumns::tables() const {
-    std::size_t sum = 0;
+    std::size_t sum = _positions ? 1 : 0;
     for (const std::unique_ptr<TechnologyTables>& technology : _technologies)
-        sum += technology->tables().size() + 1; // that of the files
+        sum += technology->tables().size() + 2; // those of the files and events
     return sum;
 }
 
 std::uint64_t InputColumns::rows() const {
-    std::uint64_t sum = 0;
-    for (const std::unique_ptr<TechnologyTables>& technology : _technologies)
+    std::uint64_t sum = _positions ? _positions->rows() : 0;
+    for (const std::unique_ptr<TechnologyTables>& technology : _technologies) {
+        sum += technology->events().rows();
         for (const TableWriter& table : technology->tables())
             sum += table.rows();
+    }
     return sum;
 }
 

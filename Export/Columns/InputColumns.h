@@ -3,6 +3,8 @@
 
 #pragma once
 
+#include "Analysis/Rules/RuleSet.h"
+#include "Export/Columns/InputTable.h"
 #include "Export/Columns/TableOutputs.h"
 #include "Export/Columns/TechnologyTables.h"
 #include "Platform/Result.h"
@@ -37,7 +39,8 @@ public:
     /// The same of one table: of long texts, a copy that is being encoded takes as much again.
     static constexpr std::size_t mostOfTable = std::size_t{6} << 20;
 
-    InputColumns(InputFile file, TableOutputs& outputs);
+    /// `rules`, whose events are in the tables, must outlive it.
+    InputColumns(InputFile file, const RuleSet& rules, TableOutputs& outputs);
 
     /// Adds a technology, and returns the sink for its observations.
     TechnologyTables& add(const Catalogue& catalogue);
@@ -45,6 +48,16 @@ public:
     void select(std::string_view technology);
     /// A message is about to be decoded, and those before it have been.
     void willDecode(const CurrentMessage& message);
+
+    /// The message that is being decoded has been, if there is one.
+    void endMessage();
+    /// Where the receiver was, as the input has it.
+    void add(const Fix& fix);
+    /// The input has a comment on that message, which is the latest one.
+    void addNote(std::uint64_t message, std::string_view text);
+    /// A part of the input before the next message could not be read. `message`: as a Loss has it; 0 for the
+    /// end.
+    void addLoss(std::uint64_t message, std::string_view reason);
 
     /// The input has ended. Of `file` counts what reading it has shown.
     Result<Done> finish(const InputFile& file);
@@ -58,16 +71,18 @@ public:
 private:
     /// Writes the largest tables until the rest is small enough.
     void limitMemory();
-    /// A message that reported nothing, not even that it has nothing to report, could not be decoded.
-    void endMessage();
+    [[nodiscard]] std::size_t limitOthers();
     void note(const Result<Done>& result);
 
     InputFile _file;
+    const RuleSet& _rules;
     TableOutputs& _outputs;
     PageCompressor _compressor;
     CurrentMessage _message;
     std::vector<std::unique_ptr<TechnologyTables>> _technologies;
     TechnologyTables* _current = nullptr;
+    std::vector<Fix> _early;              ///< before there was a technology
+    std::optional<InputTable> _positions; ///< in the directory of the input's first technology
     std::optional<Failure> _failure;
     std::uint64_t _unchecked = 0; ///< messages since memory was measured
 };

@@ -49,6 +49,15 @@ std::size_t TableLayout::find(std::string_view column) const {
     return static_cast<std::size_t>(found - columns.begin());
 }
 
+std::size_t addPlace(TableLayout& table) {
+    const std::size_t first = table.columns.size();
+    for (const char* const name : {"latitude", "longitude"}) {
+        table.columns.push_back({{name, StoredType::Integer, ValueMeaning::Degrees, true}, true});
+        table.properties.emplace_back("velmora.unit." + std::string(name), nameOf(Unit::Degree));
+    }
+    return first;
+}
+
 TableLayout messageTable(std::string name, std::string_view technology) {
     TableLayout table;
     table.name = std::move(name);
@@ -60,6 +69,7 @@ TableLayout messageTable(std::string name, std::string_view technology) {
                      {{"time", StoredType::Integer, ValueMeaning::Timestamp, false}, true},
                      {{"modem_time", StoredType::Integer, ValueMeaning::Timestamp, true}, true},
                      {{"code", StoredType::Integer, ValueMeaning::Plain, true}, false}};
+    static_cast<void>(addPlace(table));
     return table;
 }
 

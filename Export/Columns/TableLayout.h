@@ -30,7 +30,7 @@ struct TableLayout {
 };
 
 /// The version of what tables and columns are called and mean.
-inline constexpr std::string_view tableVersion = "1";
+inline constexpr std::string_view tableVersion = "2";
 
 /// What each table begins with, so that their indices are the same everywhere.
 struct CommonColumns {
@@ -39,8 +39,13 @@ struct CommonColumns {
     static constexpr std::size_t time = 2;      ///< when it arrived
     static constexpr std::size_t modemTime = 3; ///< its own time stamp
     static constexpr std::size_t code = 4;      ///< the log code
-    static constexpr std::size_t count = 5;
+    static constexpr std::size_t latitude = 5;  ///< where it arrived
+    static constexpr std::size_t longitude = 6;
+    static constexpr std::size_t count = 7;
 };
+
+/// Adds the columns of a place, and returns the index of the first.
+std::size_t addPlace(TableLayout& table);
 
 /// A table of messages, or of what they report, with the common columns and nothing else yet.
 [[nodiscard]] TableLayout messageTable(std::string name, std::string_view technology);

@@ -18,6 +18,10 @@ void TableWriter::addRow(const RowContext& context) {
         column(CommonColumns::modemTime).setInteger(_row, *context.modemTime);
     if (context.code)
         column(CommonColumns::code).setInteger(_row, *context.code);
+    if (context.place) {
+        column(CommonColumns::latitude).setInteger(_row, context.place->latitude);
+        column(CommonColumns::longitude).setInteger(_row, context.place->longitude);
+    }
 }
 
 void TableWriter::addRow(const RowContext& context, std::span<const std::uint32_t> rows,

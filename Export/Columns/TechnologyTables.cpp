@@ -6,25 +6,48 @@
 #include "Export/Columns/ValidText.h"
 #include "LogMessages/RecordTime.h"
 
+#include <chrono>
+
 namespace velmora {
 
 namespace {
 
 constexpr std::size_t sizeColumn = CommonColumns::count;
 constexpr std::size_t decodedColumn = sizeColumn + 1;
+constexpr std::size_t positionColumn = decodedColumn + 1;
 
 TableLayout messageLayout(std::string_view technology) {
     TableLayout layout = messageTable("messages", technology);
     layout.add("size_byte", StoredType::Integer);
     layout.add("decoded_flag", StoredType::Boolean);
+    for (const char* const name : {"altitude_m", "speed_m_s", "fix_age_s", "hdop", "deviation_m"})
+        layout.add(name, StoredType::Number);
     return layout;
+}
+
+/// As many decimals as `decode --positions` shows.
+void setPosition(TableWriter& table, const Position& position) {
+    const double age = std::chrono::duration<double>(position.age).count();
+    const Fix& fix = position.fix;
+    std::size_t column = positionColumn;
+    const auto set = [&](const std::optional<double>& value, int decimals) {
+        if (value)
+            table.column(column).setNumber(table.row(), rounded(*value, decimals));
+        ++column;
+    };
+    set(fix.altitude_m, 2);
+    set(fix.speed_mps, 2);
+    set(age, 3);
+    set(fix.hdop, 2);
+    set(fix.deviation_m, 2);
 }
 
 } // namespace
 
-TechnologyTables::TechnologyTables(const Catalogue& catalogue, const std::string& file,
+TechnologyTables::TechnologyTables(const Catalogue& catalogue, const RuleSet& rules, const std::string& file,
                                    CurrentMessage& message, TableOutputs& outputs, PageCompressor& compressor)
-    : _technology(catalogue.technology()), _layout(catalogue), _message(message) {
+    : _technology(catalogue.technology()), _layout(catalogue), _message(message),
+      _events(catalogue, rules, file, outputs.open("events", _technology), compressor) {
     _layout.tables.push_back(messageLayout(_technology));
     _layout.tables.push_back(OtherFields::layout(_technology));
     for (const TableLayout& layout : _layout.tables)
@@ -39,6 +62,8 @@ RowContext TechnologyTables::contextOf(const ObservedMessage& message) const {
     if (message.timestamp && isRecordTime(*message.timestamp))
         if (const std::optional<Time> own = timeOfRecord(*message.timestamp))
             context.modemTime = own->time_since_epoch().count();
+    if (_message.position)
+        context.place = coordinatesOf(_message.position->fix);
     return context;
 }
 
@@ -46,6 +71,8 @@ void TechnologyTables::addMessage(const RowContext& context, bool isDecoded) {
     _messages->addRow(context);
     _messages->column(sizeColumn).setInteger(_messages->row(), static_cast<std::int64_t>(_message.size));
     _messages->column(decodedColumn).setFlag(_messages->row(), isDecoded);
+    if (_message.position)
+        setPosition(*_messages, *_message.position);
     ++_summary.messages;
     _summary.undecoded += isDecoded ? 0 : 1;
     if (!_summary.first)
@@ -54,7 +81,13 @@ void TechnologyTables::addMessage(const RowContext& context, bool isDecoded) {
 }
 
 void TechnologyTables::addUndecoded() {
-    addMessage({_message.number, _message.arrival.time_since_epoch().count()}, false);
+    ObservedMessage nothing{};
+    nothing.number = _message.number;
+    nothing.arrival = _message.arrival;
+    nothing.damage = Damage::Unreadable;
+    const RowContext context = contextOf(nothing);
+    addMessage(context, false);
+    _events.report(nothing, _message.number, context.place);
 }
 
 void TechnologyTables::observed(const ObservedMessage& message) {
@@ -65,6 +98,7 @@ void TechnologyTables::observed(const ObservedMessage& message) {
     addMessage(context, true);
     for (const Observation& observation : message.observations)
         add(context, observation);
+    _events.report(message, _message.number, context.place);
 }
 
 void TechnologyTables::add(const RowContext& context, const Observation& observation) {

@@ -3,9 +3,11 @@
 
 #pragma once
 
+#include "Analysis/Tracks/Position.h"
 #include "Export/Columns/OtherFields.h"
 #include "Export/Columns/TableOutputs.h"
 #include "Export/Columns/TableWriter.h"
+#include "Export/Columns/TechnologyEvents.h"
 #include "LogGenerator/Observations/Observation.h"
 
 #include <cstddef>
@@ -22,18 +24,19 @@ namespace velmora {
 struct CurrentMessage {
     std::uint64_t number = 0; ///< in the file, from 1; 0 for none
     Time arrival{};
-    std::size_t size = 0;      ///< in bytes
-    bool isObserved = false;   ///< what it reported is in the tables
-    std::size_t textBytes = 0; ///< of texts that have been added since this was set to 0
+    std::size_t size = 0;                  ///< in bytes
+    std::optional<Position> position = {}; ///< where it arrived
+    bool isObserved = false;               ///< what it reported is in the tables
+    std::size_t textBytes = 0;             ///< of texts that have been added since this was set to 0
 };
 
 /// The tables of one technology of an input: "messages", one for each section and list of its catalogue,
-/// "other_fields" for what these have no column for, and "files".
+/// "other_fields" for what these have no column for, "events", and "files".
 class TechnologyTables final : public ObservationSink {
 public:
-    /// All arguments but `file` must outlive it. `message`: the one that is being decoded.
-    TechnologyTables(const Catalogue& catalogue, const std::string& file, CurrentMessage& message,
-                     TableOutputs& outputs, PageCompressor& compressor);
+    /// All arguments but `file` and `rules` must outlive it. `message`: the one that is being decoded.
+    TechnologyTables(const Catalogue& catalogue, const RuleSet& rules, const std::string& file,
+                     CurrentMessage& message, TableOutputs& outputs, PageCompressor& compressor);
 
     void observed(const ObservedMessage& message) override;
     /// The current message could not be decoded.
@@ -42,6 +45,8 @@ public:
     [[nodiscard]] const std::string& technology() const { return _technology; }
     [[nodiscard]] std::deque<TableWriter>& tables() { return _tables; }
     [[nodiscard]] const std::deque<TableWriter>& tables() const { return _tables; }
+    [[nodiscard]] TechnologyEvents& events() { return _events; }
+    [[nodiscard]] const TechnologyEvents& events() const { return _events; }
 
     /// What the table "files" says of its messages.
     struct Summary {
@@ -65,6 +70,7 @@ private:
     std::deque<TableWriter> _tables; ///< in the layout's order, then the messages, then the other fields
     TableWriter* _messages;
     std::optional<OtherFields> _others;
+    TechnologyEvents _events;
     Summary _summary;
     ObservedText _text;
     std::string _storage;

@@ -17,6 +17,7 @@
 #include "Tools/Mask/MaskedInput.h"
 #include "Tools/Output.h"
 #include "Tools/Report.h"
+#include "Tools/Rules/RuleFiles.h"
 
 #include <filesystem>
 #include <memory>
@@ -100,15 +101,14 @@ InputFile fileOf(const std::string& path, const HashedInput& input, const Messag
 /// Decodes a file and writes its tables.
 Outcome writeFile(const std::string& path, const HashedInput& input, const Begin& begin,
                   const ColumnsOptions& options, const std::optional<MaskOptions>& masking,
-                  DecoderLines& lines) {
+                  const RuleSet& rules, DecoderLines& lines) {
     const std::string title = fileTitle(path);
     InputError error;
     const Result<std::unique_ptr<MessageReader>> reader = openAgain(input, error);
     if (!reader)
         return failed(title, reader.reason());
     ColumnFiles files(options.out, dateOf(begin.first), hashOf(input, masking));
-    InputColumns columns(fileOf(path, input, **reader, masking), files);
-    ColumnsObserver observer(columns);
+    InputColumns columns(fileOf(path, input, **reader, masking), rules, files);
     const auto sumUp = [&] { lines.report(options.files.size() > 1 ? printable(title) : std::string()); };
     WorkContext context(title, [&] {
         files.discard();
@@ -118,7 +118,13 @@ Outcome writeFile(const std::string& path, const HashedInput& input, const Begin
     if (begin.technology.empty())
         request.technology = options.technology;
     const DecoderLog log(lines);
-    MaskedInput masked(**reader, path, request.technology, {}, masking);
+    // Below the mask, so that the position is that of the message by its own time.
+    PositionedReader positioned(**reader);
+    const bool hasPositions = !masking || masking->level != MaskLevel::All;
+    if (hasPositions)
+        positioned.setFixes([&columns](const Fix& fix) { columns.add(fix); });
+    MaskedInput masked(positioned, path, request.technology, {}, masking);
+    ColumnsObserver observer(columns, masked.reader(), hasPositions ? &positioned : nullptr);
     const Result<DecodedFile> decoded = decodeMessages(masked.reader(), request, context, observer);
     if (!decoded) {
         static_cast<void>(reportLosses(**reader, title));
@@ -128,6 +134,7 @@ Outcome writeFile(const std::string& path, const HashedInput& input, const Begin
     const bool allDecoded = decoded->undecoded.report(title);
     const bool whole = reportLosses(**reader, title);
     sumUp();
+    observer.finish();
     Result<Done> written = columns.finish(fileOf(path, input, **reader, masking));
     // Another time it may be read to its end: what there is of it is not what the input holds.
     if (written && error.reason)
@@ -145,7 +152,8 @@ Outcome writeFile(const std::string& path, const HashedInput& input, const Begin
 }
 
 Outcome takeFile(const std::string& path, const ColumnsOptions& options,
-                 const std::optional<MaskOptions>& masking, WrittenInputs& written, DecoderLines& lines) {
+                 const std::optional<MaskOptions>& masking, const RuleSet& rules, WrittenInputs& written,
+                 DecoderLines& lines) {
     const std::string title = fileTitle(path);
     const Result<HashedInput> input = HashedInput::open(path);
     if (!input)
@@ -157,7 +165,7 @@ Outcome takeFile(const std::string& path, const ColumnsOptions& options,
     if (written.contains(options.out / partitionOf("files", technology, dateOf(begin->first)),
                          hashOf(*input, masking)))
         return {"there already", true};
-    return writeFile(path, *input, *begin, options, masking, lines);
+    return writeFile(path, *input, *begin, options, masking, rules, lines);
 }
 
 int writeAllFiles(const ColumnsOptions& options, DecoderLines& lines, Output& output) {
@@ -166,10 +174,14 @@ int writeAllFiles(const ColumnsOptions& options, DecoderLines& lines, Output& ou
         report(masking.reason());
         return ExitStatus::BadInput;
     }
+    std::optional<DecoderLog> log(std::in_place, lines); // of the decoders whose catalogues are made
+    const AllCatalogues catalogues;
+    log.reset();
+    const RuleSet rules = loadBuiltInRules(catalogues);
     bool good = true;
     WrittenInputs written;
     for (const std::string& path : options.files) {
-        const Outcome outcome = takeFile(path, options, *masking, written, lines);
+        const Outcome outcome = takeFile(path, options, *masking, rules, written, lines);
         good = good && outcome.isGood;
         output.put(printable(fileTitle(path)) + ": " + outcome.text + "\n");
         output.flush();

@@ -70,6 +70,12 @@ RuleSet loadOnlyRules(const AllCatalogues& catalogues, std::span<const std::stri
     return readRules(catalogues, rulePaths(files));
 }
 
+RuleSet loadBuiltInRules(const AllCatalogues& catalogues) {
+    std::vector<RulePath> paths = standardRulePaths();
+    std::erase_if(paths, [](const RulePath& each) { return !each.isBuiltIn; });
+    return readRules(catalogues, paths);
+}
+
 RuleSet loadRules(const AllCatalogues& catalogues, std::span<const std::string> files) {
     std::vector<RulePath> paths = standardRulePaths();
     for (RulePath& each : rulePaths(files))

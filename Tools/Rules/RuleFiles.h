@@ -45,6 +45,8 @@ struct RulePath {
 
 /// The built-in rules and the user's, then those of the files.
 [[nodiscard]] RuleSet loadRules(const AllCatalogues& catalogues, std::span<const std::string> files);
+/// The built-in rules alone, whoever runs the program.
+[[nodiscard]] RuleSet loadBuiltInRules(const AllCatalogues& catalogues);
 /// Those of the files alone.
 [[nodiscard]] RuleSet loadOnlyRules(const AllCatalogues& catalogues, std::span<const std::string> files);
 

@@ -16,7 +16,11 @@ enum class ValueMeaning : std::uint8_t {
     Plain,     ///< what is stored: a flag, a number, bytes
     Text,      ///< UTF-8
     Timestamp, ///< nanoseconds since 1970-01-01 00:00:00 UTC
+    Degrees,   ///< a decimal number with `degreePlaces` places, as an integer
 };
+
+/// 1 cm on the ground, as far as any text of a position goes.
+inline constexpr int degreePlaces = 7;
 
 /// One column of a flat table.
 struct ColumnSchema {

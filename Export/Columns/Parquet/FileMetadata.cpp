@@ -15,6 +15,7 @@ using Element = CompactWriter::Element;
 void writeMeaning(CompactWriter& out, ValueMeaning meaning) {
     constexpr int convertedType = 6;
     constexpr int logicalType = 10;
+    constexpr int degreeDigits = 3 + degreePlaces;
     switch (meaning) {
     case ValueMeaning::Plain: return;
     case ValueMeaning::Text:
@@ -29,6 +30,16 @@ void writeMeaning(CompactWriter& out, ValueMeaning meaning) {
         out.structureMember(2);
         out.emptyMember(3); // nanoseconds
         out.endStructure();
+        out.endStructure();
+        break;
+    case ValueMeaning::Degrees:
+        out.integerMember(convertedType, 5); // the same for older readers
+        out.integerMember(7, degreePlaces);
+        out.integerMember(8, degreeDigits);
+        out.structureMember(logicalType);
+        out.structureMember(5);
+        out.integerMember(1, degreePlaces);
+        out.integerMember(2, degreeDigits);
         out.endStructure();
         break;
     }

@@ -22,7 +22,9 @@ std::uint64_t count(CompactReader& in) {
 ValueMeaning readMeaning(CompactReader& in) {
     ValueMeaning meaning = ValueMeaning::Plain;
     in.structure([&](int number) {
-        meaning = number == 1 ? ValueMeaning::Text : ValueMeaning::Timestamp;
+        meaning = number == 1   ? ValueMeaning::Text
+                  : number == 5 ? ValueMeaning::Degrees
+                                : ValueMeaning::Timestamp;
         return false;
     });
     return meaning;

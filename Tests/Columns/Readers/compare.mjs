@@ -1,25 +1,18 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 // usage: node compare.mjs CASES
-// CASES is a JSON list of {title, columns, samples, messages}: a directory of one input's columns, what `decode
-// --samples --format jsonl` lists of it, and how many messages it has. Reads the columns with each reader and compares
-// all values. Prints a line for each case; the exit status is 1 where something differs.
+// CASES is a JSON list of {title, columns, samples, events, track, messages}: a directory of one input's columns, what
+// `decode --samples --positions --format jsonl` and `events --format jsonl` list of it, the track that `convert` makes of
+// it or null, and how many messages it has. Reads the columns with each reader and compares all values. Prints a line for each case; the exit status is 1 where something differs.
 
 import fs from "node:fs";
+import {eventDifferences} from "./events.mjs";
+import {eventPlaceDifferences, fixDifferences, hasPlaceOf, positionDifferences} from "./positions.mjs";
 import {allReaders} from "./readers.mjs";
 import {filesIn, valuesOf} from "./tables.mjs";
+import {nanoseconds, sameTime, shown} from "./values.mjs";
 
 const mostDifferences = 10;
-
-/** Nanoseconds of "2026-01-05T08:00:00.162000000Z". */
-function nanoseconds(text) {
-    if (text === undefined)
-        return null;
-    const [, seconds, fraction] = /^(.*)\.(\d{9})Z$/.exec(text);
-    return BigInt(Date.parse(`${seconds}Z`)) * 1_000_000n + BigInt(fraction);
-}
-
-const shown = (value) => JSON.stringify(value, (_, each) => (typeof each === "bigint" ? `${each}` : each));
 
 /** The samples that have a value, by record and path, in their order. */
 function samplesIn(file) {
@@ -36,12 +29,6 @@ function samplesIn(file) {
     return samples;
 }
 
-function sameTime(reader, actual, expected) {
-    if (actual === null || expected === null)
-        return actual === expected;
-    return reader.microseconds ? actual / 1000n === expected / 1000n : actual === expected;
-}
-
 function sameValue(actual, sample) {
     if (typeof actual === "bigint")
         return Number(actual) === sample.value;
@@ -52,7 +39,7 @@ function isSame(reader, actual, sample) {
     return sameValue(actual.value, sample) && (actual.text === undefined || actual.text === sample.text) &&
         actual.rowKey === (sample.row ?? null) && sameTime(reader, actual.time, nanoseconds(sample.time)) &&
         sameTime(reader, actual.modemTime, nanoseconds(sample.modemTime)) &&
-        (actual.code === null ? null : Number(actual.code)) === sample.code;
+        (actual.code === null ? null : Number(actual.code)) === sample.code && hasPlaceOf(actual, sample);
 }
 
 /** What differs between the columns and the samples. */
@@ -95,7 +82,7 @@ async function tablesAlone(reader, files, messages) {
 }
 
 let failed = false;
-for (const {title, columns, samples, messages} of JSON.parse(fs.readFileSync(process.argv[2], "utf8"))) {
+for (const {title, columns, samples, events, track, messages} of JSON.parse(fs.readFileSync(process.argv[2], "utf8"))) {
     const files = filesIn(columns);
     for (const reader of await allReaders()) {
         let found;
@@ -103,7 +90,11 @@ for (const {title, columns, samples, messages} of JSON.parse(fs.readFileSync(pro
         try {
             const values = await valuesOf(files, reader);
             count = values.length;
-            found = [...await tablesAlone(reader, files, messages), ...differences(reader, values, samplesIn(samples))];
+            const expected = samplesIn(samples);
+            found = [...await tablesAlone(reader, files, messages), ...await eventDifferences(reader, files, events),
+                     ...await positionDifferences(reader, files, expected), ...await fixDifferences(reader, files, track),
+                     ...await eventPlaceDifferences(reader, files, track),
+                     ...differences(reader, values, expected)];
         } catch (error) {
             found = [`${error.stack}`];
         }

@@ -1,11 +1,11 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 // Three programs that read Parquet files. Each has an operation `read(path)`, which returns the rows as objects by
-// column: integers and times (in nanoseconds) as bigint, numbers, texts, flags, bytes as text of hexadecimal digits,
-// null for none.
+// column: integers and times (in nanoseconds) as bigint, degrees (in units of 1e-7) too, numbers, texts, flags, bytes as
+// text of hexadecimal digits, null for none.
 
 import fs from "node:fs";
-import {DuckDBInstance, DuckDBBlobValue, DuckDBTimestampTZValue} from "@duckdb/node-api";
+import {DuckDBInstance, DuckDBBlobValue, DuckDBDecimalValue, DuckDBTimestampTZValue} from "@duckdb/node-api";
 import {tableFromIPC, Type} from "apache-arrow";
 import {parquetMetadata, parquetReadObjects} from "hyparquet";
 import {compressors} from "hyparquet-compressors";
@@ -29,6 +29,8 @@ async function duckdb() {
     const plain = (value) => {
         if (value instanceof DuckDBTimestampTZValue)
             return value.micros * 1000n;
+        if (value instanceof DuckDBDecimalValue)
+            return value.value;
         return value instanceof DuckDBBlobValue ? hexadecimal(value.bytes) : value;
     };
     return {
@@ -44,6 +46,10 @@ async function duckdb() {
     };
 }
 
+/** The decimal numbers of a reader that makes doubles of them. */
+const degrees = (name, value) =>
+    (value !== null && ["latitude", "longitude"].includes(name) ? BigInt(Math.round(value * 1e7)) : value);
+
 const hyparquet = {
     name: "hyparquet",
     async read(path) {
@@ -54,7 +60,7 @@ const hyparquet = {
         const rows = await parquetReadObjects({file: bufferOf(path), compressors, parsers, utf8: false});
         for (const row of rows)
             for (const [name, value] of Object.entries(row))
-                row[name] = value instanceof Uint8Array ? hexadecimal(value) : value ?? null;
+                row[name] = value instanceof Uint8Array ? hexadecimal(value) : degrees(name, value ?? null);
         return rows;
     },
 };
@@ -71,7 +77,9 @@ function arrowValues(column) {
                 values.push(undefined);
     for (let i = 0; i < values.length; ++i)
         if (values[i] === undefined) {
-            const value = column.get(i);
+            let value = column.get(i);
+            if (column.type.typeId === Type.Decimal) // 128 bits, the lowest first
+                value = BigInt.asIntN(64, BigInt(value[0]) | BigInt(value[1]) << 32n);
             values[i] = value instanceof Uint8Array ? hexadecimal(value) : value;
         }
     return values;

@@ -53,9 +53,10 @@ export async function valuesOf(files, reader) {
     const add = (row, place, value, text) => values.push({
         record: row.message, path: place, value, text, rowKey: row.row_key ?? null,
         time: row.time, modemTime: row.modem_time, code: row.code,
+        latitude: row.latitude, longitude: row.longitude,
     });
     for (const {file, table} of files) {
-        if (table === "messages" || table === "files")
+        if (["messages", "files", "events", "positions"].includes(table))
             continue;
         const columns = fieldColumns(propertiesOf(file));
         for (const row of await reader.read(file)) {

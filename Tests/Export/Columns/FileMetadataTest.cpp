@@ -16,7 +16,8 @@ FileMetadata example() {
     metadata.columns = {{"file", StoredType::Text, ValueMeaning::Text, false},
                         {"time", StoredType::Integer, ValueMeaning::Timestamp, false},
                         {"level_dbm", StoredType::Number, ValueMeaning::Plain, true},
-                        {"is", StoredType::Boolean, ValueMeaning::Plain, true}};
+                        {"is", StoredType::Boolean, ValueMeaning::Plain, true},
+                        {"latitude", StoredType::Integer, ValueMeaning::Degrees, true}};
     metadata.properties = {{"velmora.version", "1"}, {"velmora.unit.level_dbm", "dBm"}};
     RowGroupMetadata group;
     group.rows = 3;
@@ -69,7 +70,7 @@ TEST(FileMetadata, thatLacksAColumnOfAGroupIsRefused) {
     metadata.groups[1].chunks.pop_back();
     const Result<FileMetadata> read = parseFileMetadata(parquet::bytesOf(serialized(metadata)));
     ASSERT_FALSE(read);
-    EXPECT_EQ(read.reason(), "its metadata lists 3 of 4 columns in a row group");
+    EXPECT_EQ(read.reason(), "its metadata lists 4 of 5 columns in a row group");
 }
 
 TEST(FileMetadata, thatEndsEarlyIsRefused) {

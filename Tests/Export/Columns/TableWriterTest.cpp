@@ -44,7 +44,8 @@ TEST_F(TableWriterTest, namesTheInputInEachRow) {
 
 TEST_F(TableWriterTest, hasNoValueForWhatAMessageLacks) {
     TableWriter table(_layout, "f00", _sink, _compressor);
-    table.addRow({1, 10, 20, 0x5137}, std::array<std::uint32_t, 1>{3}, "62");
+    table.addRow({1, 10, 20, 0x5137, Coordinates{481234567, -115000000}}, std::array<std::uint32_t, 1>{3},
+                 "62");
     table.addRow({2, 10});
     ASSERT_TRUE(table.finish());
     const Result<FileMetadata> metadata = _sink.metadata();
@@ -52,8 +53,9 @@ TEST_F(TableWriterTest, hasNoValueForWhatAMessageLacks) {
     std::vector<std::uint64_t> nulls;
     for (const ChunkMetadata& chunk : metadata->groups.at(0).chunks)
         nulls.push_back(chunk.statistics.nulls);
-    // file, message, time, modem_time, code, row, row_key
-    EXPECT_EQ(nulls, (std::vector<std::uint64_t>{0, 0, 0, 1, 1, 1, 1}));
+    // file, message, time, modem_time, code, latitude, longitude, row, row_key
+    EXPECT_EQ(nulls, (std::vector<std::uint64_t>{0, 0, 0, 1, 1, 1, 1, 1, 1}));
+    EXPECT_EQ(metadata->columns.at(CommonColumns::latitude).meaning, ValueMeaning::Degrees);
 }
 
 TEST_F(TableWriterTest, isAtTheLatestRowUntilItIsCut) {

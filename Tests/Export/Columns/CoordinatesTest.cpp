@@ -1,0 +1,34 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
+#include "Export/Columns/Coordinates.h"
+
+#include <gtest/gtest.h>
+
+namespace velmora {
+namespace {
+
+TEST(Coordinates, areDegreesWithSevenDecimals) {
+    Fix fix;
+    fix.latitude = 48.12345674;
+    fix.longitude = -11.50000006;
+    EXPECT_EQ(coordinatesOf(fix).latitude, 481234567);
+    EXPECT_EQ(coordinatesOf(fix).longitude, -115000001);
+}
+
+TEST(Coordinates, holdTheEndsOfTheEarth) {
+    Fix fix;
+    fix.latitude = -90;
+    fix.longitude = -180;
+    EXPECT_EQ(coordinatesOf(fix).latitude, -900000000);
+    EXPECT_EQ(coordinatesOf(fix).longitude, -1800000000);
+}
+
+TEST(Rounded, isTheDoubleOfTheDecimalNumber) {
+    EXPECT_EQ(rounded(13.256, 2), 13.26);
+    EXPECT_EQ(rounded(-0.1234, 3), -0.123);
+    EXPECT_EQ(rounded(0.1 + 0.2, 2), 0.3);
+}
+
+} // namespace
+} // namespace velmora
