@@ -62,11 +62,12 @@ function(velmora_library name)
     endif()
 endfunction()
 
-# velmora_generate_from_sections(OUTPUT TABLE [TEMPLATE file]): a file that list-sections (in Tools/ListSections) prints,
-# again whenever a section changes. A file that comes out the same is left alone, so that nothing that uses it is built
-# again. The program has to run on the machine that builds: a toolchain file for another kind names an emulator.
+# velmora_generate_from_sections(OUTPUT TABLE [TEMPLATE file] [READS file...]): a file that list-sections (in
+# Tools/ListSections) prints, again whenever a section or a file changes that it reads. A file that comes out the same is
+# left alone, so that nothing that uses it is built again. The program has to run on the machine that builds: a toolchain
+# file for another kind names an emulator.
 function(velmora_generate_from_sections output table)
-    cmake_parse_arguments(PARSE_ARGV 2 arg "" "TEMPLATE" "")
+    cmake_parse_arguments(PARSE_ARGV 2 arg "" "TEMPLATE" "READS")
     set(input)
     if(arg_TEMPLATE)
         set(input < ${arg_TEMPLATE})
@@ -77,7 +78,7 @@ function(velmora_generate_from_sections output table)
     add_custom_command(OUTPUT ${output} BYPRODUCTS ${printed}
                        COMMAND ${CMAKE_CROSSCOMPILING_EMULATOR} $<TARGET_FILE:list-sections> ${table} ${input} > ${printed}
                        COMMAND ${CMAKE_COMMAND} -E copy_if_different ${printed} ${output}
-                       DEPENDS list-sections ${arg_TEMPLATE}
+                       DEPENDS list-sections ${arg_TEMPLATE} ${arg_READS}
                        COMMENT "Generating ${name} from the sections" VERBATIM)
 endfunction()
 

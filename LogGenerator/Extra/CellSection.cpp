@@ -95,7 +95,10 @@ void CellSection::describe(const View& view, ContentVisitor& visitor) const {
     if (isList)
         visitor.beginList(table.list);
     for (const CellField& row : table.fields)
-        visitor.field(row.field);
+        visitor.keyed(row.field,
+                      {.key = cellNumberKeys[row.key.index],
+                       .lowBits = row.number == CellNumber::Whole ? std::uint8_t{0} : std::uint8_t{16},
+                       .isSigned = row.number == CellNumber::SignedLow16});
     if (isList)
         visitor.endList();
 }

@@ -42,9 +42,10 @@ public:
     void decode(const View& view, const Record& record, FieldVisitor& visitor) const override;
     void describe(const View& view, ContentVisitor& visitor) const override;
 
-protected:
     /// What is shown of the array, a constant.
     [[nodiscard]] virtual const CellTable& cellTable() const = 0;
+
+protected:
     /// The array cannot be read: the error line "Failed to get Cell Array".
     virtual void noCells() const;
 

@@ -78,7 +78,7 @@ void SimInfo::decode(const View&, const Record&, FieldVisitor& visitor) const {
 
 void SimInfo::describe(const View&, ContentVisitor& visitor) const {
     for (const SIMFile& file : simFiles)
-        visitor.field(file.field);
+        visitor.keyed(file.field, {file.key});
 }
 
 } // namespace velmora

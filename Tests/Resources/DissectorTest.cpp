@@ -21,6 +21,7 @@
 #include <cstdio>
 #include <ctime>
 #include <filesystem>
+#include <map>
 #include <sstream>
 #include <string>
 #include <vector>
@@ -184,28 +185,36 @@ struct OddRow {
     const char* info;
 };
 const OddRow oddRows[] = {
-    {"good", "01 0C00 2C51 0000000000000000", "", "0x512C  GSM RR Info  0 bytes"},
-    {"extra stream", "FF 0D00 0100 0000000000000000 77", "",
+    {"good", "01 1000 2C51 0000000000000000 00000000", "", "0x512C  GSM RR Info  4 bytes"},
+    {"below the least length of its code", "01 0F00 2C51 0000000000000000 000000",
+     "Record 0x512C: 16 bytes, wanted at least 17", "0x512C  GSM RR Info  3 bytes"},
+    {"more entries than it holds", "01 1000 0540 0000000000000000 00 01 0000",
+     "Record 0x4005: 0 of 1 entries", "0x4005  GSM Set, UMTS Set  4 bytes"},
+    {"extra stream without a list", "FF 0D00 0100 0000000000000000 77",
+     "Property list cannot be read: 1 bytes that begin neither <?xml nor bplist00",
      "0xFF0001  GSM Serving Cell, Neighboring Cells, Serving PLMN, UMTS Set, UMTS RR Info  1 bytes"},
     {"nobody's code", "01 0C00 7513 0000000000000000", "", "0x1375  0 bytes"},
     {"empty", "", "Message is too short: 0 bytes, wanted at least 13", "Empty"},
     {"12 bytes", "01 0C00 2C51 00000000000000", "Message is too short: 12 bytes, wanted at least 13",
      "Too short: 12 bytes, wanted at least 13"},
-    {"prefixed", "8100 01 0C00 2C51 0000000000000000", "", "0x512C  GSM RR Info  0 bytes, prefixed"},
+    {"prefixed", "8100 01 1000 2C51 0000000000000000 00000000", "", "0x512C  GSM RR Info  4 bytes, prefixed"},
     // As decoders do, the length is looked at before the prefix is taken away.
     {"prefixed, 13 bytes in all", "8100 01 0C00 2C51 000000000000",
      "Length is not the record's: 12, 10 bytes follow the type;"
-     "Record ends within its time stamp: 11 bytes, wanted at least 13",
+     "Record ends within its time stamp: 11 bytes, wanted at least 13;"
+     "Record 0x512C: 11 bytes, wanted at least 17",
      "0x512C  GSM RR Info  0 bytes, prefixed"},
     {"type 2", "02 0C00 2C51 0000000000000000", "Type is neither stream's: 0x02, wanted 0x01 or 0xff",
      "0x512C  [type 0x02]  0 bytes"},
-    {"length", "01 0F00 2C51 0000000000000000 99", "Length is not the record's: 15, 13 bytes follow the type",
-     "0x512C  GSM RR Info  1 bytes"},
+    {"length", "01 0F00 2C51 0000000000000000 99000000",
+     "Length is not the record's: 15, 16 bytes follow the type", "0x512C  GSM RR Info  4 bytes"},
     {"chips past their unit", "01 0C00 2C51 00C0 000000000000",
-     "Time stamp is out of range: 0 units of 1.25 ms and 49152 of 49152 parts",
+     "Time stamp is out of range: 0 units of 1.25 ms and 49152 of 49152 parts;"
+     "Record 0x512C: 13 bytes, wanted at least 17",
      "0x512C  GSM RR Info  0 bytes"},
     {"time past the year 2262", "01 0C00 2C51 0000 FFFFFFFFFFFF",
-     "Time stamp is out of range: 281474976710655 units of 1.25 ms and 0 of 49152 parts",
+     "Time stamp is out of range: 281474976710655 units of 1.25 ms and 0 of 49152 parts;"
+     "Record 0x512C: 13 bytes, wanted at least 17",
      "0x512C  GSM RR Info  0 bytes"},
 };
 
@@ -285,6 +294,33 @@ TEST_F(Dissector, acceptsAnyInput) {
     EXPECT_EQ(dissectedFields(capture(messages), {"frame.number"}).size(), messages.size());
     EXPECT_EQ(dissectedFields(capture(messages, "IFX"), {"frame.number"}).size(), messages.size());
     EXPECT_THAT(dissected(capture(messages), "-V"), Each(Not(HasSubstr("exception"))));
+}
+
+/// Records of every code, cut at every length and with bytes turned over: the counts in them, too.
+TEST_F(Dissector, acceptsRecordsThatAreCutOrDamaged) {
+    for (const ExampleRecording& recording : exampleRecordings()) {
+        const auto reader = openMessages(VELMORA_SOURCE_DIR "/Tests/Recordings/" + recording.fileName());
+        ASSERT_TRUE(reader) << reader.reason();
+        std::vector<Data> messages;
+        std::map<std::uint32_t, int> taken; // of each code
+        while (const auto message = (*reader)->next()) {
+            const Bytes good = message->message.bytes();
+            const auto header = LogMessage::parse(good);
+            if (++taken[header ? header->logCode() : 0] > 2)
+                continue;
+            const std::size_t step = std::max<std::size_t>(1, good.size() / 60);
+            for (std::size_t size = 0; size < good.size(); size += step) {
+                messages.push_back(Data::copyOf(good.first(size)));
+                std::vector<std::uint8_t> bytes(good.begin(), good.end());
+                bytes[size] = static_cast<std::uint8_t>(~bytes[size]);
+                messages.emplace_back(std::move(bytes));
+            }
+        }
+        const std::string path = capture(messages, (*reader)->technology());
+        EXPECT_EQ(dissectedFields(path, {"frame.number"}).size(), messages.size());
+        EXPECT_THAT(dissected(path, "-V"), Each(Not(HasSubstr("exception"))));
+        EXPECT_THAT(dissected(capture(messages, ""), "-V"), Each(Not(HasSubstr("exception"))));
+    }
 }
 
 } // namespace

@@ -2,15 +2,21 @@
 // SPDX-License-Identifier: MIT
 
 #include "Platform/Console.h"
+#include "Platform/Linux/Files/FileResources.h"
 #include "Platform/PrintableText.h"
 #include "Platform/UTF8.h"
+#include "Tools/ListSections/DissectorTables.h"
 #include "Tools/ListSections/TechnologyTable.h"
 
 #include <cstdio>
+#include <exception>
+#include <fstream>
 #include <functional>
 #include <iomanip>
 #include <iostream>
+#include <map>
 #include <sstream>
+#include <stdexcept>
 #include <string>
 #include <string_view>
 
@@ -123,25 +129,62 @@ std::string dissectorCharacters() {
            "\n    },\n";
 }
 
-/// Copies the dissector's template, with the tables in place of the lines that name them. Whether each was
-/// named once.
-bool writeDissector(const Tables& tables, std::istream& source, std::ostream& dissector) {
-    int sections = 0;
-    int records = 0;
-    for (std::string line; std::getline(source, line);) {
-        if (line == "@SECTIONS@") {
-            ++sections;
-            dissector << dissectorSections(tables);
-        } else if (line == "@RECORDS@") {
-            ++records;
-            dissector << dissectorRecords(tables);
-        } else if (line == "@CHARACTERS@") {
-            dissector << dissectorCharacters();
-        } else {
-            dissector << line << '\n';
+/// A line "@PART name@" stands for the file of that name beside the template.
+constexpr std::string_view partMarker = "@PART ";
+
+/// Copies the dissector's template, with its parts and the tables in place of the lines that name them.
+class DissectorWriter {
+public:
+    DissectorWriter(const Tables& tables, std::ostream& dissector)
+        : _templates({VELMORA_RESOURCE_DIRECTORY}), _dissected(_templates), _dissector(dissector) {
+        _tables["@SECTIONS@"] = dissectorSections(tables);
+        _tables["@RECORDS@"] = dissectorRecords(tables);
+        _tables["@CHARACTERS@"] = dissectorCharacters();
+        _tables["@VIEWS@"] = _dissected.views();
+        _tables["@PATHS@"] = _dissected.paths();
+        std::ostringstream fields;
+        _dissected.fields().writeFields(fields);
+        _tables["@FIELDS@"] = fields.str();
+        std::ostringstream texts;
+        _dissected.fields().writeTexts(texts);
+        _tables["@TEXTS@"] = texts.str();
+    }
+
+    void write(std::istream& source) {
+        for (std::string line; std::getline(source, line);) {
+            if (const auto table = _tables.find(line); table != _tables.end()) {
+                ++_uses[line];
+                _dissector << table->second;
+            } else if (line.starts_with(partMarker) && line.ends_with('@')) {
+                writePart(line.substr(partMarker.size(), line.size() - partMarker.size() - 1));
+            } else {
+                _dissector << line << '\n';
+            }
         }
     }
-    return sections == 1 && records == 1;
+    /// Whether the tables that every dissector has were named once.
+    [[nodiscard]] bool isComplete() { return _uses["@SECTIONS@"] == 1 && _uses["@RECORDS@"] == 1; }
+
+private:
+    void writePart(const std::string& name) {
+        std::ifstream part(VELMORA_RESOURCE_DIRECTORY "/wireshark/" + name);
+        if (!part)
+            throw std::runtime_error("no part " + name);
+        write(part);
+    }
+
+    FileResources _templates;
+    DissectorTables _dissected;
+    std::ostream& _dissector;
+    std::map<std::string, std::string> _tables; ///< by their lines
+    std::map<std::string, int> _uses;
+};
+
+/// Whether the template named the tables.
+bool writeDissector(const Tables& tables, std::istream& source, std::ostream& dissector) {
+    DissectorWriter writer(tables, dissector);
+    writer.write(source);
+    return writer.isComplete();
 }
 
 int run(std::string_view what) {
@@ -172,5 +215,10 @@ int main(int argc, char* argv[]) {
     // Class indexes print lines when they are destroyed; standard output is for the tables.
     if (std::FILE* const nowhere = std::fopen("/dev/null", "w"))
         velmora::redirectConsole(nowhere);
-    return velmora::run(what);
+    try {
+        return velmora::run(what);
+    } catch (const std::exception& failure) {
+        std::cerr << "list-sections: " << failure.what() << '\n';
+        return 1;
+    }
 }

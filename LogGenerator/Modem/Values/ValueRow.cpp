@@ -33,7 +33,7 @@ void visitValues(const Dictionary& values, std::span<const ValueRow> rows, Field
 
 void describeValues(std::span<const ValueRow> rows, ContentVisitor& visitor) {
     for (const ValueRow& row : rows)
-        visitor.field(row.field);
+        visitor.keyed(row.field, {row.key, row.range.least, row.range.most, row.divisor});
 }
 
 } // namespace velmora::LiveModem
