@@ -27,8 +27,11 @@ RecordingCopy::RecordingCopy(PcapngReader& reader, std::unique_ptr<OutputFile> f
     reader.setOtherBlocks([this](const PcapngReader::Block& block) { addOther(block); });
 }
 
-Result<Done> RecordingCopy::addMessage() {
-    addBlock(pcapngCopy::readablePacket(_reader.block()));
+Result<Done> RecordingCopy::addMessage(std::span<const std::string> comments) {
+    std::vector<std::uint8_t> packet = pcapngCopy::readablePacket(_reader.block());
+    if (!comments.empty() && !pcapngCopy::addComments(packet, comments, _reader.block().bigEndian))
+        return Failure{"a packet of this kind cannot have a comment"};
+    addBlock(std::move(packet));
     return _failure ? Result<Done>(*_failure) : Done{};
 }
 

@@ -11,6 +11,7 @@
 #include <cstdint>
 #include <memory>
 #include <optional>
+#include <span>
 #include <string>
 #include <string_view>
 #include <vector>
@@ -34,8 +35,9 @@ public:
     /// after this has been destroyed.
     RecordingCopy(PcapngReader& reader, std::unique_ptr<OutputFile> file, std::string name, Names names);
 
-    /// Adds the message that the reader last returned.
-    Result<Done> addMessage();
+    /// Adds the message that the reader last returned, with these comments beside its own. Fails where its
+    /// packet is of a kind that has none.
+    Result<Done> addMessage(std::span<const std::string> comments = {});
     /// Adds a fix, on an interface of positions that the copy gets. Fails where the recording has positions
     /// of its own, and where it is big-endian.
     Result<Done> addFix(const Fix& fix);
