@@ -101,6 +101,7 @@ CommandLine parseCommandLine(int count, const char* const* arguments) {
 
     Commands commands;
     commands.add(app, addDecode);
+    commands.add(app, addBrowse);
     commands.add(app, addWatch);
     commands.add(app, addRecord);
     commands.add(app, addConvert);

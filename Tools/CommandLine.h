@@ -5,6 +5,7 @@
 
 #include "Platform/Linux/ProgramLog.h"
 #include "Platform/SystemLog.h"
+#include "Tools/Browse/BrowseOptions.h"
 #include "Tools/Columns/ColumnsOptions.h"
 #include "Tools/Convert/ConvertOptions.h"
 #include "Tools/Decode/DecodeOptions.h"
@@ -38,7 +39,7 @@ struct CommandLine {
         false; ///< decoder lines as they arise, not summed up; those of objects made and destroyed too
     std::variant<Notice, DecodeOptions, WatchOptions, RecordOptions, ConvertOptions, InfoOptions,
                  FieldsOptions, EventsOptions, RulesOptions, StatsOptions, DiffOptions, MaskCommandOptions,
-                 ColumnsOptions, ReportOptions>
+                 ColumnsOptions, ReportOptions, BrowseOptions>
         command;
 };
 

@@ -6,6 +6,7 @@
 #include "Platform/Console.h"
 #include "Platform/Linux/Files/FileResources.h"
 #include "Platform/Linux/StandardDescriptors.h"
+#include "Tools/Browse/BrowseCommand.h"
 #include "Tools/Columns/ColumnsCommand.h"
 #include "Tools/CommandLine.h"
 #include "Tools/Convert/ConvertCommand.h"
@@ -61,6 +62,8 @@ int run(const CommandLine& line, DecoderLines& lines, Output& output) {
         return runDiff(*diff, lines, output);
     if (const auto* page = std::get_if<ReportOptions>(&line.command))
         return runReport(*page, lines);
+    if (const auto* browse = std::get_if<BrowseOptions>(&line.command))
+        return runBrowse(*browse, output);
     const DecoderLog log(lines);
     if (const auto* info = std::get_if<InfoOptions>(&line.command))
         return runInfo(*info, output);

@@ -101,6 +101,28 @@ Buffer readablePacket(const BlockReader::Block& block) {
     return copy;
 }
 
+bool addComments(Buffer& packet, std::span<const std::string> comments, bool bigEndian) {
+    ByteReader fields(packet, bigEndian);
+    const std::size_t length = fields.u32(4);
+    const std::size_t options = packetDataOffset + pcapng::padded(fields.u32(capturedOffset));
+    if (fields.u32(0) != pcapng::BlockType::EnhancedPacket || !fields.isGood() || options + 4 > length)
+        return false;
+    Buffer added;
+    for (const std::string& comment : comments)
+        putOption(added, pcapng::Option::Comment,
+                  Bytes(reinterpret_cast<const std::uint8_t*>(comment.data()), comment.size()), bigEndian);
+    if (options + 4 == length)
+        putOption(added, pcapng::Option::End, {}, bigEndian);
+    // What follows may be further parts of a long message.
+    packet.insert(packet.begin() + static_cast<std::ptrdiff_t>(options), added.begin(), added.end());
+    Buffer number;
+    put(number, static_cast<std::uint32_t>(length + added.size()), 4, bigEndian);
+    std::copy(number.begin(), number.end(), packet.begin() + 4);
+    std::copy(number.begin(), number.end(),
+              packet.begin() + static_cast<std::ptrdiff_t>(length + added.size() - 4));
+    return true;
+}
+
 void shiftInterface(Buffer& block, std::uint32_t from) {
     namespace BlockType = pcapng::BlockType;
     constexpr std::size_t interfaceOffset = pcapng::bodyOffset;

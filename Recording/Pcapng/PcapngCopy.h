@@ -6,6 +6,8 @@
 #include "Recording/Pcapng/BlockReader.h"
 
 #include <cstdint>
+#include <span>
+#include <string>
 #include <string_view>
 #include <vector>
 
@@ -26,6 +28,11 @@ namespace velmora::pcapngCopy {
 /// The packet as capture tools read it: a message that is too long for them in one block is put into several
 /// (see pcapng::longestPart). All others stay as they are.
 [[nodiscard]] std::vector<std::uint8_t> readablePacket(const BlockReader::Block& block);
+
+/// Adds comments to a packet as `readablePacket` returns it, before its other options. False where it is of a
+/// kind that has no options like these; it is not changed then. Precondition: each has at most 65535 bytes.
+[[nodiscard]] bool addComments(std::vector<std::uint8_t>& packet, std::span<const std::string> comments,
+                               bool bigEndian);
 
 /// Makes room for an interface of that number: higher and equal numbers in a little-endian packet or block of
 /// statistics grow by one.

@@ -35,10 +35,13 @@ void RecordingCopy::setPositionRange(SentencesOfRange::SideOf sideOf) {
     });
 }
 
-Result<Done> RecordingCopy::addMessage() {
+Result<Done> RecordingCopy::addMessage(std::span<const std::string> comments) {
+    std::vector<std::uint8_t> packet = pcapngCopy::readablePacket(_reader.block());
+    if (!comments.empty() && !pcapngCopy::addComments(packet, comments, _reader.block().bigEndian))
+        return Failure{"a packet of this kind cannot have a comment"};
     if (_range)
         _range->addMessage();
-    addBlock(pcapngCopy::readablePacket(_reader.block()));
+    addBlock(std::move(packet));
     return _failure ? Result<Done>(*_failure) : Done{};
 }
 

@@ -13,6 +13,7 @@
 #include <cstdint>
 #include <memory>
 #include <optional>
+#include <span>
 #include <string>
 #include <string_view>
 #include <vector>
@@ -39,8 +40,9 @@ public:
     /// Copies only positions of that range (see SentencesOfRange), the default being all. Before anything has
     /// been read.
     void setPositionRange(SentencesOfRange::SideOf sideOf);
-    /// Adds the message that the reader last returned.
-    Result<Done> addMessage();
+    /// Adds the message that the reader last returned, with these comments beside its own. Fails where its
+    /// packet is of a kind that has none.
+    Result<Done> addMessage(std::span<const std::string> comments = {});
     /// Adds a fix, on an interface of positions that the copy gets. Fails where the recording has positions
     /// of its own, and where it is big-endian.
     Result<Done> addFix(const Fix& fix);

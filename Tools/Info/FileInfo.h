@@ -6,21 +6,14 @@
 #include "Recording/MessageReader.h"
 #include "Tools/Decode/UndecodedMessages.h"
 #include "Tools/Info/MessageSummary.h"
+#include "Tools/Messages/CodeNames.h"
 
 #include <cstdint>
-#include <functional>
 #include <optional>
 #include <string>
 #include <vector>
 
 namespace velmora {
-
-/// A technology's names of log codes.
-struct CodeNames {
-    const char* heading = "sections";
-    /// Returns the names of a code, none for one without subscriber. Null without a decoder.
-    std::function<std::vector<std::string>(std::uint32_t code)> namesOf;
-};
 
 /// What a file holds of one technology.
 struct TechnologyInfo {

@@ -1,0 +1,103 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
+#include "Tools/Browse/Data/MarkedCopy.h"
+
+#include "Platform/Linux/Errno.h"
+#include "Platform/Linux/Files/AtomicFile.h"
+#include "Recording/Files/DescriptorFile.h"
+#include "Recording/OpenMessages.h"
+#include "Recording/Pcapng/PcapngReader.h"
+#include "Recording/Pcapng/PcapngWriter.h"
+#include "Recording/Pcapng/RecordingCopy.h"
+#include "Tools/OutputGuard.h"
+
+#include <cerrno>
+#include <memory>
+#include <span>
+#include <vector>
+
+#include <fcntl.h>
+
+namespace velmora {
+
+namespace {
+
+constexpr mode_t newFileMode = 0600;
+
+} // namespace
+
+/// Calls `add` with each message of the range and its notes.
+template <class Add>
+Result<std::uint64_t> MarkedCopy::copyMessages(MessageReader& reader, Add add) const {
+    reader.setReadsAllTechnologies(true);
+    std::uint64_t position = 0;
+    std::uint64_t written = 0;
+    while (position <= last) {
+        const std::optional<LoggedMessage> message = reader.next();
+        if (!message)
+            break;
+        const std::vector<std::string> technologies = reader.technologies();
+        // A file that names no technology, or that is shown as another, has one.
+        if (technologies.size() > 1 && technologies[message->technology] != technology)
+            continue;
+        if (position >= first) {
+            std::vector<std::string> comments;
+            if (const auto note = notes.find(position); note != notes.end())
+                comments.push_back(note->second);
+            if (const Result<Done> added = add(*message, comments); !added)
+                return Failure{added.reason()};
+            ++written;
+        }
+        ++position;
+    }
+    if (reader.failure())
+        return Failure{reader.failure()->reason};
+    return written;
+}
+
+Result<std::uint64_t> MarkedCopy::writeTo(int descriptor) const {
+    const Result<std::unique_ptr<MessageReader>> reader = openMessages(input);
+    if (!reader)
+        return Failure{reader.reason()};
+    if (auto* const recording = dynamic_cast<PcapngReader*>(reader->get())) {
+        RecordingCopy copy(*recording, std::make_unique<DescriptorFile>(descriptor, false), output,
+                           {.technology = {}, .only = {}});
+        Result<std::uint64_t> written =
+            copyMessages(*recording, [&copy](const LoggedMessage&, std::span<const std::string> comments) {
+                return copy.addMessage(comments);
+            });
+        if (const Result<Done> finished = copy.finish(); written && !finished)
+            return Failure{finished.reason()};
+        return written;
+    }
+    const int own = ::fcntl(descriptor, F_DUPFD_CLOEXEC, 0);
+    if (own < 0)
+        return Failure{errnoText(errno)};
+    const Result<std::unique_ptr<PcapngWriter>> writer = PcapngWriter::adopt(own, output, technology);
+    if (!writer)
+        return Failure{writer.reason()};
+    Result<std::uint64_t> written = copyMessages(
+        **reader, [&writer](const LoggedMessage& message, std::span<const std::string> comments) {
+            return (*writer)->append(message.time, message.message.bytes(), comments);
+        });
+    if (const Result<Done> closed = (*writer)->close(); written && !closed)
+        return Failure{closed.reason()};
+    return written;
+}
+
+Result<std::uint64_t> MarkedCopy::write() const {
+    if (const std::string reason = whyNotWritten(input, output, false); !reason.empty())
+        return Failure{reason};
+    Result<AtomicFile> file = AtomicFile::create(output, newFileMode);
+    if (!file)
+        return Failure{output + ": " + file.reason()};
+    Result<std::uint64_t> written = writeTo(file->descriptor());
+    if (!written)
+        return written;
+    if (const Result<Done> committed = file->commit(AtomicFile::IfExists::Refuse); !committed)
+        return Failure{output + ": " + committed.reason()};
+    return written;
+}
+
+} // namespace velmora

@@ -1,0 +1,35 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include "Platform/Result.h"
+#include "Recording/MessageReader.h"
+
+#include <cstdint>
+#include <limits>
+#include <map>
+#include <string>
+
+namespace velmora {
+
+/// Some of a file's messages in a new recording, with notes as comments on them. The input is never changed,
+/// and nothing is overwritten. What a recording holds beside messages, such as positions, is kept.
+struct MarkedCopy {
+    std::string input;
+    std::string output;
+    std::string technology;  ///< the short name of the messages that count
+    std::uint64_t first = 0; ///< positions among the technology's messages
+    std::uint64_t last = std::numeric_limits<std::uint64_t>::max();
+    std::map<std::uint64_t, std::string> notes; ///< by position; others than those written are left out
+
+    /// Returns how many messages were written.
+    [[nodiscard]] Result<std::uint64_t> write() const;
+
+private:
+    [[nodiscard]] Result<std::uint64_t> writeTo(int descriptor) const;
+    template <class Add>
+    [[nodiscard]] Result<std::uint64_t> copyMessages(MessageReader& reader, Add add) const;
+};
+
+} // namespace velmora

@@ -1,0 +1,159 @@
+// SPDX-FileCopyrightText: 2026 Velmora contributors
+// SPDX-License-Identifier: MIT
+
+#include "Tools/Browse/Data/MessageInspector.h"
+
+#include "LogMessages/LogMessage.h"
+#include "Platform/PrintableText.h"
+#include "Playback/QuietDecoding.h"
+
+#include <algorithm>
+#include <set>
+#include <string_view>
+#include <unordered_set>
+#include <utility>
+
+namespace velmora {
+
+namespace {
+
+/// Messages before the one that is taken apart, so that what is old can be recognized: some 10 seconds.
+constexpr std::uint64_t lead = 256;
+
+/// In unsigned numbers, since a damaged file may have any times.
+bool isLongBefore(Time earlier, Time later) {
+    const auto age = static_cast<std::uint64_t>(later.time_since_epoch().count()) -
+                     static_cast<std::uint64_t>(earlier.time_since_epoch().count());
+    constexpr std::chrono::nanoseconds old = MessageInspector::oldAge;
+    return earlier < later && age > static_cast<std::uint64_t>(old.count());
+}
+
+} // namespace
+
+MessageInspector::~MessageInspector() {
+    if (_decoder)
+        _decoder->decoder().setObservationSink(nullptr);
+}
+
+bool MessageInspector::begin(std::uint64_t position) {
+    const RecordingIndex::Checkpoint& checkpoint =
+        _file.index().beforeMessage(position - std::min(position, lead));
+    if (_decoder && _decoder->messages() <= position && checkpoint.messages() <= _decoder->messages())
+        return true;
+    if (_decoder)
+        _decoder->decoder().setObservationSink(nullptr);
+    const std::string& technology = _file.index().technology();
+    Result<std::unique_ptr<PlayedDecoder>> decoder =
+        checkpoint.decoder ? PlayedDecoder::make(technology, {}, *checkpoint.decoder)
+                           : PlayedDecoder::make(technology, {});
+    if (!decoder) {
+        _failure = decoder.reason();
+        return false;
+    }
+    _decoder = *std::move(decoder);
+    _beginning = checkpoint.latest;
+    _latest.clear();
+    _decoder->decoder().setObservationSink(this);
+    return true;
+}
+
+bool MessageInspector::takeNext() {
+    std::optional<LoggedMessage> message = _cursor.at(_decoder->messages());
+    if (!message) {
+        _failure = _cursor.failure();
+        return false;
+    }
+    if (_isWanted) {
+        _inspected.message = *message;
+        _inspected.message.message = Data::copyOf(message->message.bytes()); // the reader's chunk is large
+        message->message = _inspected.message.message;
+    }
+    _decoder->take(*message);
+    return true;
+}
+
+const InspectedMessage* MessageInspector::inspect(std::uint64_t position) {
+    if (_hasInspected && _inspected.position == position)
+        return &_inspected;
+    const QuietDecoding quiet;
+    _hasInspected = false;
+    _failure.clear();
+    if (!begin(position))
+        return nullptr;
+    _isWanted = false;
+    while (_decoder->messages() < position)
+        if (!takeNext())
+            return nullptr;
+    const std::vector<DisplayRow> before = displayRows(_decoder->display());
+    _inspected = {};
+    _inspected.position = position;
+    _isWanted = true;
+    const bool isTaken = takeNext();
+    _isWanted = false;
+    if (!isTaken)
+        return nullptr;
+    _inspected.rows = displayRows(_decoder->display());
+    markChanges(_inspected.rows, before);
+    addAges();
+    _hasInspected = true;
+    return &_inspected;
+}
+
+void MessageInspector::observed(const ObservedMessage& message) {
+    for (const Observation& each : message.observations) {
+        if (each.leaf->index >= _latest.size())
+            _latest.resize(each.leaf->index + 1, Time::min());
+        _latest[each.leaf->index] = message.arrival;
+    }
+    if (!_isWanted)
+        return;
+    std::set<std::string> sections;
+    for (const Observation& each : message.observations)
+        sections.insert(each.leaf->section);
+    const FieldPlaces places(_decoder->decoder(), _inspected.message.message, sections);
+    for (const Observation& each : message.observations) {
+        ReportedField field;
+        each.appendPath(field.path);
+        field.text = printable(_text.of(each));
+        field.place = placeOf(each, places);
+        _inspected.fields.push_back(std::move(field));
+    }
+}
+
+std::optional<FieldPlace> MessageInspector::placeOf(const Observation& observation,
+                                                    const FieldPlaces& places) const {
+    if (!observation.source || !observation.source->field || observation.source->field->place.isComputed())
+        return std::nullopt;
+    const Bytes bytes = _inspected.message.message.bytes();
+    const Place& place = observation.source->field->place;
+    std::optional<std::size_t> begin = places.find(*observation.source->field, observation.rows);
+    if (!begin && !observation.source->list && observation.source->subPacket == 0)
+        if (const std::optional<LogMessage> parsed = LogMessage::parse(bytes))
+            begin = parsed->prefixed ? LogMessage::prefixLength : 0;
+    if (!begin || *begin + place.end() > bytes.size())
+        return std::nullopt;
+    return FieldPlace{*begin + place.offset, *begin + place.end(), place.bit, place.width};
+}
+
+void MessageInspector::addAges() {
+    std::unordered_set<std::string_view> reported;
+    for (const ReportedField& field : _inspected.fields)
+        reported.insert(field.path);
+    const Catalogue& catalogue = _decoder->decoder().catalogue();
+    const Time now = _inspected.message.time;
+    for (DisplayRow& row : _inspected.rows) {
+        if (row.isBranch)
+            continue;
+        row.isReported = reported.contains(row.path);
+        const CatalogueField* const leaf = leafOfPath(catalogue, row.path);
+        if (!leaf)
+            continue;
+        const bool isKnown = leaf->index < _latest.size() && _latest[leaf->index] != Time::min();
+        if (isKnown)
+            row.latest = _latest[leaf->index];
+        const Time latest = row.latest.value_or(_beginning);
+        row.isOld = isLongBefore(latest, now);
+    }
+}
+
+} // namespace velmora
