@@ -14,7 +14,7 @@ namespace {
 
 constexpr int degreeDecimals = 7; ///< a centimetre
 
-std::string quoted(std::string_view text) {
+std::string inQuotes(std::string_view text) {
     std::string escaped = "\"";
     for (std::size_t at = 0; at < text.size();) {
         const std::size_t begin = at;
@@ -45,7 +45,7 @@ std::string pointGeometry(const Fix& fix) {
 }
 
 std::string member(std::string_view name, const std::string& value) {
-    return "," + quoted(name) + ":" + value;
+    return "," + inQuotes(name) + ":" + value;
 }
 
 std::string optionalMember(std::string_view name, std::optional<double> value) {
@@ -59,7 +59,7 @@ std::string feature(const std::string& geometry, const char* kind, const std::st
 
 std::string fixFeature(const TrackData& track, const TrackData::Point& point) {
     const Fix& fix = point.fix;
-    std::string members = member("time", quoted(trackTime(fix.time))) +
+    std::string members = member("time", inQuotes(trackTime(fix.time))) +
                           optionalMember("speed", fix.speed_mps) +
                           optionalMember("course", fix.course_degrees) + optionalMember("hdop", fix.hdop) +
                           optionalMember("deviation", fix.deviation_m);
@@ -67,7 +67,7 @@ std::string fixFeature(const TrackData& track, const TrackData::Point& point) {
         const TrackData::Value& value = point.values[i];
         const std::string text = valueText(value);
         const bool isNumber = std::holds_alternative<double>(value);
-        members += member(track.attributes[i].name, text.empty() ? "null" : isNumber ? text : quoted(text));
+        members += member(track.attributes[i].name, text.empty() ? "null" : isNumber ? text : inQuotes(text));
     }
     return feature(pointGeometry(fix), "fix", members);
 }
@@ -87,18 +87,18 @@ std::string lineFeature(const std::vector<TrackData::Point>& segment) {
                                      ? R"({"type":"LineString","coordinates":)" + coordinates + "}"
                                      : R"({"type":"MultiLineString","coordinates":[)" + coordinates + "]}";
     return feature(geometry, "track",
-                   member("time", quoted(trackTime(segment.front().fix.time))) +
-                       member("end", quoted(trackTime(segment.back().fix.time))));
+                   member("time", inQuotes(trackTime(segment.front().fix.time))) +
+                       member("end", inQuotes(trackTime(segment.back().fix.time))));
 }
 
 std::string eventFeature(const TrackData::PlacedEvent& placed) {
     const Event& event = placed.event;
-    return feature(placed.fix ? pointGeometry(*placed.fix) : "null", "event",
-                   member("time", quoted(trackTime(event.time))) +
-                       (event.end ? member("end", quoted(trackTime(*event.end))) : "") +
-                       member("kind", quoted(event.kind)) +
-                       member("severity", quoted(nameOf(event.severity))) +
-                       member("text", quoted(event.text)) + member("technology", quoted(event.technology)));
+    return feature(
+        placed.fix ? pointGeometry(*placed.fix) : "null", "event",
+        member("time", inQuotes(trackTime(event.time))) +
+            (event.end ? member("end", inQuotes(trackTime(*event.end))) : "") +
+            member("kind", inQuotes(event.kind)) + member("severity", inQuotes(nameOf(event.severity))) +
+            member("text", inQuotes(event.text)) + member("technology", inQuotes(event.technology)));
 }
 
 } // namespace

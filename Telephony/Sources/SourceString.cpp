@@ -21,7 +21,7 @@ constexpr std::string_view modemKey = "modem=";
 constexpr std::string_view simKey = "sim=";
 constexpr std::string_view technologyKey = "technology=";
 
-std::string quoted(std::string_view text) {
+std::string inQuotes(std::string_view text) {
     return '"' + std::string(text) + '"';
 }
 
@@ -42,7 +42,7 @@ Result<Done> parseSpeed(std::string_view text, bool unpacedAllowed, std::optiona
     speed = unpacedAllowed && text == "max" ? 0.0 : numberOf<double>(text);
     const bool good = speed && std::isfinite(*speed) && (unpacedAllowed ? *speed >= 0 : *speed > 0);
     if (!good)
-        return Failure{"speed is " + quoted(text) + ", wanted a number " +
+        return Failure{"speed is " + inQuotes(text) + ", wanted a number " +
                        (unpacedAllowed ? "from 0 up, or max" : "above 0")};
     return Done{};
 }
@@ -52,7 +52,7 @@ Result<SourceChoice> parseScenario(std::string_view text) {
     std::size_t comma = text.find(',');
     choice.name = text.substr(0, comma);
     if (!scenarioKindNamed(choice.name))
-        return Failure{"scenario is " + quoted(choice.name) + ", wanted one of: " + scenarioNames()};
+        return Failure{"scenario is " + inQuotes(choice.name) + ", wanted one of: " + scenarioNames()};
     std::optional<std::uint64_t> seed;
     std::optional<double> speed;
     while (comma != std::string_view::npos) {
@@ -65,14 +65,14 @@ Result<SourceChoice> parseScenario(std::string_view text) {
             const std::string_view number = option.substr(seedKey.size());
             seed = numberOf<std::uint64_t>(number);
             if (!seed)
-                return Failure{"seed is " + quoted(number) +
+                return Failure{"seed is " + inQuotes(number) +
                                ", wanted a whole number from 0 to 18446744073709551615"};
         } else if (option.starts_with(speedKey)) {
             const auto taken = parseSpeed(option.substr(speedKey.size()), false, speed);
             if (!taken)
                 return Failure{taken.reason()};
         } else {
-            return Failure{"option is " + quoted(option) + ", wanted seed=N or speed=X"};
+            return Failure{"option is " + inQuotes(option) + ", wanted seed=N or speed=X"};
         }
     }
     choice.seed = seed.value_or(choice.seed);
@@ -98,7 +98,7 @@ Result<SourceChoice> parseReplay(std::string_view text) {
                 return Failure{"technology is given twice, wanted once"};
             const std::string_view name = option.substr(technologyKey.size());
             if (!isTechnology(name))
-                return Failure{"technology is " + quoted(name) + ", wanted one of: " + technologyNames()};
+                return Failure{"technology is " + inQuotes(name) + ", wanted one of: " + technologyNames()};
             choice.technology = shortTechnologyName(name);
         } else {
             break;
@@ -106,7 +106,7 @@ Result<SourceChoice> parseReplay(std::string_view text) {
         text = text.substr(0, comma);
     }
     if (text.empty() || text == "-")
-        return Failure{"file is " + quoted(text) +
+        return Failure{"file is " + inQuotes(text) +
                        ", wanted the name of a file, which is read anew for each client"};
     choice.file = text;
     choice.speed = speed.value_or(choice.speed);
@@ -119,7 +119,7 @@ Result<Done> parseOnce(std::string_view name, std::string_view value, const Resu
     if (!taken.empty())
         return Failure{std::string(name) + " is given twice, wanted once"};
     if (!check)
-        return Failure{std::string(name) + " is " + quoted(value) + ", " + check.reason()};
+        return Failure{std::string(name) + " is " + inQuotes(value) + ", " + check.reason()};
     taken = value;
     return Done{};
 }
@@ -131,7 +131,7 @@ Result<SourceChoice> parseModemManager(std::string_view text) {
         text.remove_prefix(1);
         const std::string_view option = text.substr(0, text.find(','));
         text.remove_prefix(option.size());
-        Result<Done> taken = Failure{"option is " + quoted(option) + ", wanted modem=MODEM or sim=SIM"};
+        Result<Done> taken = Failure{"option is " + inQuotes(option) + ", wanted modem=MODEM or sim=SIM"};
         if (option.starts_with(modemKey)) {
             const std::string_view modem = option.substr(modemKey.size());
             taken = parseOnce("modem", modem, ModemChoice().setModem(modem), choice.modem);
@@ -157,7 +157,7 @@ Result<SourceChoice> parseSource(std::string_view text) {
         return parseReplay(text.substr(replay.size()));
     if (text == modemManager || text.starts_with(std::string(modemManager) + ','))
         return parseModemManager(text.substr(modemManager.size()));
-    return Failure{"source is " + quoted(text) + ", wanted " + std::string(sourceForms)};
+    return Failure{"source is " + inQuotes(text) + ", wanted " + std::string(sourceForms)};
 }
 
 std::string loggedSource(std::string_view text, const SourceChoice& choice) {

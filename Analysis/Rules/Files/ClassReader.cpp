@@ -18,7 +18,7 @@ namespace {
 
 constexpr std::array<std::string_view, 5> classKeys{"value", "radio-technology", "fair", "good", "excellent"};
 
-std::string quoted(std::string_view text) {
+std::string inQuotes(std::string_view text) {
     return printableLine(text.substr(0, 64));
 }
 
@@ -43,7 +43,8 @@ bool isLevel(const ExpressionType& type) {
 }
 
 std::string got(const TOMLNode& node) {
-    return "got " + (node.kind == TOMLNode::Kind::Text ? quoted(node.text) : std::string(nameOf(node.kind)));
+    return "got " +
+           (node.kind == TOMLNode::Kind::Text ? inQuotes(node.text) : std::string(nameOf(node.kind)));
 }
 
 } // namespace
@@ -126,7 +127,7 @@ void ClassReader::addPath(const TOMLNode& path, std::vector<LevelClasses::Subjec
     if (!input)
         _errors.add(path.position, input.reason());
     else if (!isLevel(input->type))
-        _errors.add(path.position, "got '" + quoted(path.text) + "', which is " + describe(input->type) +
+        _errors.add(path.position, "got '" + inQuotes(path.text) + "', which is " + describe(input->type) +
                                        ", wanted a number in dBm or dB");
     else
         subjects.push_back({.path = path.text});

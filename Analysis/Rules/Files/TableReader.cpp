@@ -17,7 +17,7 @@ namespace {
 
 constexpr std::chrono::duration<double> longestSpan = std::chrono::hours(24);
 
-std::string quoted(std::string_view key) {
+std::string inQuotes(std::string_view key) {
     return printableLine(key.substr(0, 64));
 }
 
@@ -27,7 +27,7 @@ TableReader::TableReader(const TOMLNode& table, std::span<const std::string_view
     : _table(table), _errors(errors) {
     for (const TOMLNode::Entry& each : table.entries)
         if (std::find(keys.begin(), keys.end(), each.key) == keys.end())
-            errors.add(each.position, "got the key " + quoted(each.key) + ", wanted one like " +
+            errors.add(each.position, "got the key " + inQuotes(each.key) + ", wanted one like " +
                                           nearestNames(each.key.substr(0, 64), keys));
 }
 
@@ -58,7 +58,7 @@ std::optional<Time::duration> spanOf(const TOMLNode& node, FileErrors& errors) {
     else if (node.kind == TOMLNode::Kind::Text)
         seconds = readSpan(node.text);
     if (!seconds || !(*seconds >= 0) || *seconds > longestSpan.count()) {
-        const std::string got = node.kind == TOMLNode::Kind::Text ? quoted(node.text)
+        const std::string got = node.kind == TOMLNode::Kind::Text ? inQuotes(node.text)
                                 : node.kind == TOMLNode::Kind::Number
                                     ? numberWithUnit(node.number, Unit::None)
                                     : std::string(nameOf(node.kind));
