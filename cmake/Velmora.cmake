@@ -49,7 +49,7 @@ endif()
 # copies past their end, and does not know a system's header once it is precompiled.
 set(velmora_precompiled_headers <algorithm> <array> <chrono> <filesystem> <functional> <map> <memory> <optional> <span>
                                 <string> <string_view> <variant> <vector>)
-set(velmora_precompiled_options $<$<CXX_COMPILER_ID:GNU>:-Wno-array-bounds;-Wno-restrict;-Wno-stringop-overflow>)
+set(velmora_precompiled_options $<$<CXX_COMPILER_ID:GNU>:-Wno-array-bounds;-Wno-restrict;-Wno-stringop-overflow;-Wno-stringop-overread>)
 
 # velmora_library(NAME SOURCES file... [LINK target...]): a static library; what it links is all it may include.
 function(velmora_library name)
