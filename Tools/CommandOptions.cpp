@@ -80,4 +80,9 @@ void addSafe(CLI::App& command, CSVGuard& guard) {
         "number, which spreadsheets would calculate");
 }
 
+void checkSafe(CSVGuard guard, bool isCSV) {
+    if (guard == CSVGuard::On && !isCSV)
+        throw CLI::ValidationError("--safe", "got another format, wanted --format csv");
+}
+
 } // namespace velmora

@@ -33,5 +33,7 @@ void addTechnologyOption(CLI::App& command, std::string& technology, const std::
 
 /// `--safe`, which turns the guard of CSV's cells on.
 void addSafe(CLI::App& command, CSVGuard& guard);
+/// To be called when all options are known: `--safe` is a usage error with another format.
+void checkSafe(CSVGuard guard, bool isCSV);
 
 } // namespace velmora

@@ -3,17 +3,15 @@
 
 #include "Tools/Convert/ConvertCommand.h"
 
-#include "Platform/Linux/Files/AtomicFile.h"
 #include "Platform/Linux/Files/Files.h"
-#include "Recorder/OverwriteTarget.h"
 #include "Recording/OpenMessages.h"
 #include "Recording/Positions/TrackFile.h"
 #include "Tools/Convert/Conversion.h"
 #include "Tools/Decode/Decoding.h"
 #include "Tools/Decode/RefreshCount.h"
 #include "Tools/ExitStatus.h"
+#include "Tools/MadeFile.h"
 #include "Tools/Messages/TechnologyChoice.h"
-#include "Tools/OutputGuard.h"
 #include "Tools/Report.h"
 #include "Tools/Stats/StatsOptions.h"
 
@@ -30,8 +28,6 @@
 namespace velmora {
 
 namespace {
-
-constexpr mode_t newFileMode = S_IRUSR | S_IWUSR;
 
 /// How many refreshes the file takes; none where it is no regular file, which can be read but once.
 std::optional<std::uint64_t> refreshesOf(const std::string& file, const Conversion& conversion) {
@@ -68,25 +64,10 @@ Result<std::vector<Fix>> positionsOf(const ConvertOptions& options) {
     return fixes ? std::move(fixes) : Failure{options.track + ": " + fixes.reason()};
 }
 
-/// Whether all of the input is in the output now.
-bool convert(const ConvertOptions& options, const std::filesystem::path& target, MessageReader& reader,
-             const std::string& title, std::vector<Fix> positions) {
-    // Before the output, so that an allocation that fails never leaves one on the disk.
-    AtomicFile* made = nullptr;
-    WorkContext context(title, [&made] {
-        if (made)
-            made->discard();
-    });
-    Result<AtomicFile> output = AtomicFile::create(target, newFileMode);
-    if (!output) {
-        report(options.out + ": " + output.reason());
-        return false;
-    }
-    made = &*output;
-    const RemovedWhenInterrupted removed(output->path());
+Conversion conversionOf(const ConvertOptions& options, std::vector<Fix> positions) {
     Conversion conversion;
     conversion.form = *formFromName(options.out);
-    conversion.title = title;
+    conversion.title = fileTitle(options.file);
     conversion.path = options.file;
     conversion.name = options.out;
     conversion.technology = options.technology;
@@ -100,26 +81,14 @@ bool convert(const ConvertOptions& options, const std::filesystem::path& target,
     conversion.isStrict = options.isStrict;
     if (conversion.form == FileForm::Snapshot)
         conversion.refreshes = refreshesOf(options.file, conversion);
-    const Result<bool> converted = convertMessages(reader, conversion, output->descriptor(), context);
-    if (!converted) {
-        report(converted.reason());
-        return false;
-    }
-    using IfExists = AtomicFile::IfExists;
-    const auto committed = output->commit(options.force ? IfExists::Replace : IfExists::Refuse);
-    if (!committed)
-        report(options.out + ": " + committed.reason());
-    return committed && *converted;
+    return conversion;
 }
 
 } // namespace
 
 int runConvert(const ConvertOptions& options) {
-    if (const std::string reason = whyNotWritten(options.file, options.out, options.force); !reason.empty()) {
-        report(reason);
-        return ExitStatus::BadInput;
-    }
-    const Result<std::filesystem::path> target = overwriteTarget(options.out);
+    const MadeFile file{options.file, options.out, options.force};
+    const Result<std::filesystem::path> target = targetOf(file);
     if (!target) {
         report(target.reason());
         return ExitStatus::BadInput;
@@ -129,14 +98,16 @@ int runConvert(const ConvertOptions& options) {
         report(positions.reason());
         return ExitStatus::BadInput;
     }
-    const std::string title = fileTitle(options.file);
-    const Result<std::unique_ptr<MessageReader>> reader = openMessages(options.file);
+    const Result<std::unique_ptr<MessageReader>> reader = inputOf(file);
     if (!reader) {
-        report(title + ": " + reader.reason());
+        report(reader.reason());
         return ExitStatus::BadInput;
     }
-    const bool converted = convert(options, *target, **reader, title, *std::move(positions));
-    const bool whole = reportLosses(**reader, title);
+    const bool converted = makeFile(file, *target, [&](AtomicFile& made, WorkContext& context) {
+        const Conversion conversion = conversionOf(options, *std::move(positions));
+        return convertMessages(**reader, conversion, made.descriptor(), context);
+    });
+    const bool whole = reportLosses(**reader, fileTitle(options.file));
     return converted && whole ? ExitStatus::Done : ExitStatus::BadInput;
 }
 

@@ -26,8 +26,7 @@ void checkTogether(const DecodeOptions& options) {
         throw CLI::ValidationError("--max-age",
                                    "got another output, wanted --every refresh with --format jsonl "
                                    "or csv");
-    if (options.guard == CSVGuard::On && options.format != Format::Csv)
-        throw CLI::ValidationError("--safe", "got another format, wanted --format csv");
+    checkSafe(options.guard, options.format == Format::Csv);
     if (options.samples != DecodeOptions::Samples::None) {
         const bool isWide = options.samples == DecodeOptions::Samples::Wide;
         if (isWide && options.format != Format::Csv)

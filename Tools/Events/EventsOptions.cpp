@@ -7,6 +7,7 @@
 #include "Tools/Events/Programs/CommandText.h"
 #include "Tools/Messages/PositionOptions.h"
 #include "Tools/Messages/SelectionOptions.h"
+#include "Tools/Stats/ChoiceOptions.h"
 
 #include <sstream>
 
@@ -19,8 +20,7 @@ constexpr std::uint64_t maximumCount = 1'000'000'000'000;
 
 void checkTogether(const EventsOptions& options) {
     using Format = EventsOptions::Format;
-    if (options.guard == CSVGuard::On && options.format != Format::Csv)
-        throw CLI::ValidationError("--safe", "got another format, wanted --format csv");
+    checkSafe(options.guard, options.format == Format::Csv);
     if (options.hasEvidence && options.format != Format::Text)
         throw CLI::ValidationError("--records", "got another format, wanted --format text: the others have "
                                                 "them");
@@ -112,16 +112,7 @@ void addFormat(CLI::App& command, EventsOptions& options) {
     command.add_flag("--live", options.isLive,
                      "Write each event as soon as it is known, one that lasts at its begin too, as without a "
                      "FILE: for a pipe; by default events are sorted by their begin");
-    command
-        .add_option_function<std::string>(
-            "--clock",
-            [&options](const std::string& name) {
-                options.clock = name == "modem" ? AnalysisClock::Modem : AnalysisClock::Arrival;
-            },
-            "Whose times: arrival (the default), when messages arrived; modem, the time stamps that the "
-            "modem gave them")
-        ->check(oneOf({"arrival", "modem"}))
-        ->type_name("arrival|modem");
+    addClock(command, options.clock);
     addTechnology(command, options.technology, "Analyse as");
     addMaskOption(command, options.mask);
 }

@@ -34,31 +34,26 @@ LiveEvents::LiveEvents(const EventsOptions& options, const RuleSet& rules, Decod
                        ServiceClient& client, Output& output, MessageMask* mask)
     : _options(options), _lines(lines), _client(client), _output(output), _mask(mask),
       _listing(options, rules, output, [] { return SignalWatcher::hasSignal(); }),
-      _log(lines, [this](const std::string& problem) { reportProblem(problem); }) {
-    RecordingModel::Events events;
-    events.connecting = [this] {
-        loseService();
-        _client.queue.async([this] { check(); });
-    };
-    events.message = [this](const Data& message) { take(message); };
-    events.sourceEnded = [this] { endWithSource(); };
-    events.technology = [this](std::string_view technology, bool hasDecoder) {
-        return learn(technology, hasDecoder);
-    };
-    _model = std::make_shared<RecordingModel>(client.platform(), std::move(events));
-}
+      _link(client, lines,
+            {[this](std::string_view technology, bool hasDecoder) { return learn(technology, hasDecoder); },
+             [this](const Data& message) { take(message); }, [this] { endWithSource(); },
+             [this](const std::string& text) {
+                 report(text);
+                 interrupt();
+             },
+             [](const std::string& text) { report(text); }, [](const std::string& text) { report(text); }}) {}
 
 int LiveEvents::run() {
     const WorkContext context(serviceTitle, [this] {
         _listing.flush();
-        _model->destroyPorts();
+        _link.close();
     });
     const SignalWatcher signals([this](int) {
         if (EventPrograms* const programs = _listing.programs())
             programs->stop();
         end(true);
     });
-    _client.queue.async([model = _model] { model->restartMonitor(); });
+    _link.start();
     if (_options.duration_seconds)
         _client.queue.after(nanosecondsOf(*_options.duration_seconds), [this] { end(true); });
     if (_options.timeout_seconds)
@@ -68,7 +63,7 @@ int LiveEvents::run() {
     if (_listing.programs())
         programs = _client.queue.repeating(programInterval, [this] { _listing.programs()->check(); });
     const bool good = _client.loop.run() == ExitStatus::Done;
-    _model->destroyPorts();
+    _link.close();
     {
         const DecoderLog log(_lines);
         _listing.finish();
@@ -78,8 +73,6 @@ int LiveEvents::run() {
 
 /// The service has named the technology. Returns whether to start streaming.
 bool LiveEvents::learn(std::string_view technology, bool hasDecoder) {
-    if (_ended)
-        return false;
     const DecoderLog log(_lines);
     const Result<TechnologyFeed*> feed = _listing.feed().of(std::string(technology));
     if (!feed || !hasDecoder) {
@@ -89,14 +82,11 @@ bool LiveEvents::learn(std::string_view technology, bool hasDecoder) {
         return false;
     }
     _technology = *feed;
-    // The start command follows at once. A service that is lost before the next check is lost all the same.
-    _streaming = true;
-    _hasStreamed = true;
     return true;
 }
 
 void LiveEvents::take(const Data& message) {
-    if (_ended || !_technology)
+    if (!_technology)
         return;
     {
         const DecoderLog log(_lines);
@@ -117,7 +107,7 @@ void LiveEvents::take(const Data& message) {
 
 /// A number of messages that has not come by now does not come at all.
 void LiveEvents::endWithSource() {
-    if (_ended || !_options.count)
+    if (!_options.count)
         return;
     report(std::string(serviceTitle) + "'s source has ended after " + std::to_string(_messages) + " of " +
            std::to_string(*_options.count) + " messages");
@@ -131,42 +121,23 @@ void LiveEvents::check() {
         end(true);
         return;
     }
-    // The model checks by itself, but at the pace of its redraws.
-    _model->refresh();
-    if (!_model->isConnected()) {
-        loseService();
-        return;
-    }
-    _streaming = true;
-    _hasStreamed = true;
-    if (std::exchange(_gone, false))
-        report(std::string(serviceTitle) + " is back");
+    _link.check();
 }
 
-/// Also at each attempt to connect: the service may have ended and restarted between two checks.
-void LiveEvents::loseService() {
-    if (_ended || !std::exchange(_streaming, false))
-        return;
-    _gone = true;
-    report(std::string(serviceTitle) + " is gone; waiting for it");
+void LiveEvents::interrupt() {
     const DecoderLog log(_lines);
     _listing.feed().interrupt();
-}
-
-/// At the start. Afterwards a lost service is reported as such, whatever the reason.
-void LiveEvents::reportProblem(const std::string& problem) const {
-    if (!_ended && !_hasStreamed)
-        report(problem + "; retrying");
 }
 
 void LiveEvents::giveUp() {
     if (_ended || _technology)
         return;
-    report(timeoutMessage(_log.problem(), *_options.timeout_seconds));
+    report(timeoutMessage(_link.problem(), *_options.timeout_seconds));
     end(false);
 }
 
 void LiveEvents::end(bool good) {
+    _link.end();
     if (!std::exchange(_ended, true))
         _client.loop.quit(good ? ExitStatus::Done : ExitStatus::BadInput);
 }

@@ -8,9 +8,8 @@
 #include "Tools/Events/EventListing.h"
 #include "Tools/Events/EventsOptions.h"
 #include "Tools/Log/DecoderLines.h"
-#include "Tools/Log/ServiceLog.h"
 #include "Tools/Output.h"
-#include "Tools/Record/RecordingModel.h"
+#include "Tools/Record/ServiceLink.h"
 #include "Tools/ServiceClient.h"
 
 #include <cstdint>
@@ -36,9 +35,8 @@ private:
     void take(const Data& message);
     void endWithSource();
     void check();
-    void loseService();
+    void interrupt();
     void giveUp();
-    void reportProblem(const std::string& problem) const;
     void end(bool good);
 
     const EventsOptions& _options;
@@ -47,13 +45,9 @@ private:
     Output& _output;
     MessageMask* _mask;
     EventListing _listing;
-    ServiceLog _log;
-    std::shared_ptr<RecordingModel> _model;
+    ServiceLink _link;
     TechnologyFeed* _technology = nullptr; ///< the service's; null before it has named one
     std::uint64_t _messages = 0;
-    bool _streaming = false;   ///< the start command has been sent
-    bool _hasStreamed = false; ///< at any time so far
-    bool _gone = false;        ///< the service is gone, and that has been reported
     bool _isGood = true;
     bool _ended = false;
 };

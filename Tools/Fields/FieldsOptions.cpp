@@ -54,10 +54,7 @@ CLI::App* addFields(CLI::App& app, FieldsOptions& options) {
         ->check(oneOf({"text", "json", "csv"}))
         ->type_name("text|json|csv");
     addSafe(*command, options.guard);
-    command->callback([&options] {
-        if (options.guard == CSVGuard::On && options.format != FieldsOptions::Format::Csv)
-            throw CLI::ValidationError("--safe", "got another format, wanted --format csv");
-    });
+    command->callback([&options] { checkSafe(options.guard, options.format == FieldsOptions::Format::Csv); });
     command->footer("A * in a path stands for each row of a list. The json conforms to\n"
                     "velmora-log-fields.schema.json.\n\n"
                     "Examples:\n"

@@ -36,28 +36,23 @@ Recorder::Recorder(const RecordOptions& options, RecordingSession& session, Deco
                    ServiceClient& client, RecordedPositions& positions)
     : _options(options), _session(session), _client(client), _positions(positions),
       _news(session, client.clock.now()),
-      _log(lines, [this](const std::string& problem) { reportProblem(problem); }) {
-    RecordingModel::Events events;
-    events.connecting = [this] {
-        loseService();
-        // Once the attempt is over, and not half a second later: the service may be lost again by then.
-        _client.queue.async([this] { checkService(); });
-    };
-    events.message = [this](const Data& message) { take(message); };
-    events.sourceEnded = [this] { endWithSource(); };
-    events.technology = [this](std::string_view technology, bool hasDecoder) {
-        return learn(technology, hasDecoder);
-    };
-    _model = std::make_shared<RecordingModel>(client.platform(), std::move(events));
-}
+      _link(client, lines,
+            {[this](std::string_view technology, bool hasDecoder) { return learn(technology, hasDecoder); },
+             [this](const Data& message) { take(message); }, [this] { endWithSource(); },
+             [this](const std::string& text) {
+                 _hasTechnology = false;
+                 _news.notify(text);
+             },
+             [this](const std::string& text) { welcome(text); },
+             [this](const std::string& text) { _news.inform(text); }}) {}
 
 int Recorder::run() {
     const WorkContext context(serviceTitle, [this] {
         _session.removeIfEmpty();
-        _model->destroyPorts();
+        _link.close();
     });
     const SignalWatcher signals([this](int) { end(ExitStatus::Done); });
-    _client.queue.async([model = _model] { model->restartMonitor(); });
+    _link.start();
     if (_options.duration_seconds)
         _client.queue.after(nanosecondsOf(*_options.duration_seconds), [this] { end(ExitStatus::Done); });
     if (_options.timeout_seconds)
@@ -69,31 +64,21 @@ int Recorder::run() {
     showProgress();
     const int status = _client.loop.run();
     _positions.stop();
-    _model->destroyPorts();
+    _link.close();
     _news.endProgress();
     return status;
 }
 
-/// The service has named the technology. Returns whether to start streaming: without a decoder there is no
-/// start command to send.
+/// The service has named the technology. Returns whether to start streaming.
 bool Recorder::learn(std::string_view technology, bool hasDecoder) {
-    if (_ended)
-        return false;
     if (!hasDecoder)
         return check(Failure{"the telephony service speaks " + std::string(shortTechnologyName(technology)) +
                              ", which has no decoder here, wanted one of " + technologyNames()});
     _hasTechnology = true;
-    if (!check(_session.setTechnology(technology)))
-        return false;
-    // The start command follows at once. A service that is lost before the next check is lost all the same.
-    _streaming = true;
-    _hasStreamed = true;
-    return true;
+    return check(_session.setTechnology(technology));
 }
 
 void Recorder::take(const Data& message) {
-    if (_ended)
-        return;
     const Time now = _client.clock.now();
     _positions.willRecord(now, message.bytes());
     if (!_ended && check(_session.append(now, message.bytes())) && _options.count &&
@@ -110,7 +95,7 @@ void Recorder::takeSentence(Time time, std::string_view sentence) {
 
 /// A number of messages that has not come by now does not come at all.
 void Recorder::endWithSource() {
-    if (_ended || !_options.count)
+    if (!_options.count)
         return;
     _news.notify(std::string(serviceTitle) + "'s source has ended after " +
                  std::to_string(_session.messages()) + " of " + std::to_string(*_options.count) +
@@ -132,7 +117,7 @@ void Recorder::saveSoon() {
 void Recorder::save() {
     if (_ended)
         return;
-    checkService();
+    _link.check();
     if (_session.hasClosedReader())
         end(ExitStatus::Done);
     else if (_session.temporaryError().empty())
@@ -146,46 +131,18 @@ void Recorder::retry() {
         showProgress();
 }
 
-void Recorder::checkService() {
-    if (_ended)
-        return;
-    // The model checks by itself, but at the pace of its redraws.
-    _model->refresh();
-    if (!_model->isConnected()) {
-        loseService();
-        return;
-    }
-    _streaming = true;
-    _hasStreamed = true;
-    if (!std::exchange(_gone, false))
-        return;
-    // A service that does not name a technology again is streamed from as before.
-    _news.notify(std::string(serviceTitle) + " is back" +
-                 (_hasTechnology
-                      ? std::string()
-                      : ", without naming its technology; recording goes on as " + _session.technology()));
-}
-
-/// Also at each attempt to connect: the service may have ended and restarted between two checks.
-void Recorder::loseService() {
-    if (_ended || !std::exchange(_streaming, false))
-        return;
-    _gone = true;
-    _hasTechnology = false;
-    _news.notify(std::string(serviceTitle) + " is gone; waiting for it");
-}
-
-/// At the start. Afterwards a lost service is reported as such, whatever the reason.
-void Recorder::reportProblem(const std::string& problem) {
-    if (!_ended && !_hasStreamed)
-        _news.inform(problem + "; retrying");
+/// A service that does not name a technology again is streamed from as before.
+void Recorder::welcome(const std::string& text) {
+    _news.notify(_hasTechnology ? text
+                                : text + ", without naming its technology; recording goes on as " +
+                                      _session.technology());
 }
 
 /// The service has had its time to name a technology.
 void Recorder::giveUp() {
     if (_ended || !_session.technology().empty())
         return;
-    _news.inform("nothing was recorded: " + timeoutMessage(_log.problem(), *_options.timeout_seconds));
+    _news.inform("nothing was recorded: " + timeoutMessage(_link.problem(), *_options.timeout_seconds));
     end(ExitStatus::BadInput);
 }
 
@@ -206,10 +163,11 @@ bool Recorder::check(const Result<Done>& result) {
 }
 
 void Recorder::showProgress() {
-    _news.showProgress(_client.clock.now(), _model->isConnected());
+    _news.showProgress(_client.clock.now(), _link.isConnected());
 }
 
 void Recorder::end(int status) {
+    _link.end();
     if (std::exchange(_ended, true))
         return;
     _client.loop.quit(status);

@@ -4,14 +4,12 @@
 #pragma once
 
 #include "Recorder/RecordingSession.h"
-#include "Tools/Log/ServiceLog.h"
 #include "Tools/Record/Positions/RecordedPositions.h"
 #include "Tools/Record/RecordOptions.h"
-#include "Tools/Record/RecordingModel.h"
 #include "Tools/Record/RecordingNews.h"
+#include "Tools/Record/ServiceLink.h"
 #include "Tools/ServiceClient.h"
 
-#include <memory>
 #include <string>
 #include <string_view>
 
@@ -36,10 +34,8 @@ private:
     void save();
     void saveSoon();
     void retry();
-    void checkService();
-    void loseService();
+    void welcome(const std::string& text);
     void giveUp();
-    void reportProblem(const std::string& problem);
     bool check(const Result<Done>& result);
     void showProgress();
     void end(int status);
@@ -49,11 +45,8 @@ private:
     ServiceClient& _client;
     RecordedPositions& _positions;
     RecordingNews _news;
-    ServiceLog _log; ///< over the progress line of the news, which only lines that are written replace
-    std::shared_ptr<RecordingModel> _model;
-    bool _streaming = false;     ///< the start command has been sent
-    bool _hasStreamed = false;   ///< at any time so far
-    bool _gone = false;          ///< the service is gone, and that has been reported
+    ServiceLink
+        _link; ///< whose log is over the progress line of the news: only lines that are written replace it
     bool _hasTechnology = false; ///< named since the service was lost
     bool _ended = false;
     bool _savesSoon = false; ///< a task is queued that saves what has been taken

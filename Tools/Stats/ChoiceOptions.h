@@ -13,7 +13,7 @@ class App;
 
 namespace velmora {
 
-/// What `stats` and `diff` have in common. Parsing fills what must outlive `command`.
+/// What commands that analyse recordings have in common. Parsing fills what must outlive `command`.
 
 /// Adds `--select` and `--role`.
 void addChoice(CLI::App& command, NodeSelection& selection, RoleSelection& roles);

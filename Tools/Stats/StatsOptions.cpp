@@ -32,8 +32,7 @@ std::optional<double> squareSize(std::string_view text) {
 
 void checkTogether(const StatsOptions& options) {
     using Format = StatsOptions::Format;
-    if (options.guard == CSVGuard::On && options.format != Format::Csv)
-        throw CLI::ValidationError("--safe", "got another format, wanted --format csv");
+    checkSafe(options.guard, options.format == Format::Csv);
     if (options.hasHistogram && options.format == Format::Csv)
         throw CLI::ValidationError("--histogram", "got --format csv too, wanted --format text or json");
 }
