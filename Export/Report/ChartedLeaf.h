@@ -8,6 +8,7 @@
 
 #include <cstdint>
 #include <memory>
+#include <optional>
 #include <string_view>
 
 namespace velmora {
@@ -24,6 +25,7 @@ struct ChartedLeaf {
     ReportChart chart;
     bool isNeighbour; ///< of the rows of a message the best one alone is shown
     SeriesBuckets buckets;
+    std::optional<double> best = {}; ///< of the rows of the current message so far
 };
 
 /// The chart that shows the leaf: by its role, otherwise by its unit.

@@ -67,23 +67,27 @@ void TechnologyReport::observe(const MessageReport& report) {
             _cells.addLevel(each.number);
         else if (use.role == Role::ServingQuality)
             _cells.addQuality(each.number);
-        if (use.series && !use.series->isNeighbour)
+        if (!use.series)
+            continue;
+        if (use.series->isNeighbour)
+            addNeighbour(*use.series, each.number);
+        else
             use.series->buckets.add(report.time, each.number, report.message);
     }
-    if (!hasNeighbour)
-        return;
-    for (ChartedLeaf& series : _series) {
-        if (!series.isNeighbour)
-            continue;
-        const Observation* best = nullptr;
-        for (const Observation& each : report.observed.observations)
-            if (each.leaf == series.leaf && each.kind == ObservedKind::Number && std::isfinite(each.number) &&
-                (!best || each.number > best->number))
-                best = &each;
-        if (best)
-            series.buckets.add(report.time, best->number, report.message);
+    for (ChartedLeaf* const series : _neighbourSeries) {
+        if (hasNeighbour)
+            series->buckets.add(report.time, *series->best, report.message);
+        series->best.reset();
     }
-    _neighbours.report(report, _engine.picture());
+    _neighbourSeries.clear();
+    if (hasNeighbour)
+        _neighbours.report(report, _engine.picture());
+}
+
+void TechnologyReport::addNeighbour(ChartedLeaf& series, double value) {
+    if (!series.best)
+        _neighbourSeries.push_back(&series);
+    series.best = series.best ? std::max(*series.best, value) : value;
 }
 
 void TechnologyReport::classify() {
@@ -108,11 +112,16 @@ void TechnologyReport::setBands(const MessageReport& report) {
     const auto nameOfAny = [](const auto& value) {
         return value ? std::optional<std::string_view>(nameOf(*value)) : std::nullopt;
     };
-    _technologyBand.set(report.time, nameOfAny(picture.technology()));
-    _modeBand.set(report.time, nameOfAny(picture.mode()));
+    // Names are compared where the states are others.
+    const States states{picture.technology(), picture.mode(), _class};
+    if (states != _bandStates) {
+        _technologyBand.set(report.time, nameOfAny(states.technology));
+        _modeBand.set(report.time, nameOfAny(states.mode));
+        _classBand.set(report.time, nameOfAny(states.levelClass));
+        _bandStates = states;
+    }
     _radioBand.set(report.time, textOf(Role::RadioState));
     _registrationBand.set(report.time, textOf(Role::RegistrationState));
-    _classBand.set(report.time, nameOfAny(_class));
     // By number: what is known of a cell, and so its name, grows while it serves.
     if (_cells.number() == _bandCell)
         return;
@@ -129,6 +138,7 @@ void TechnologyReport::forget(Time time) {
     for (StateBand* const band :
          {&_technologyBand, &_classBand, &_modeBand, &_radioBand, &_registrationBand, &_cellBand})
         band->end(time);
+    _bandStates = {};
     _cells.interrupt();
     _bandCell = ServingCells::unknown;
     _last.reset();

@@ -65,9 +65,19 @@ private:
         ChartedLeaf* series = nullptr;
     };
 
+    /// What bands show by name.
+    struct States {
+        std::optional<RadioTechnology> technology = {};
+        std::optional<RadioMode> mode = {};
+        std::optional<LevelClass> levelClass = {};
+        friend bool operator==(const States&, const States&) = default;
+    };
+
     [[nodiscard]] const Use& useOf(const CatalogueField& leaf);
     [[nodiscard]] std::chrono::nanoseconds pass(Time time);
     void observe(const MessageReport& report);
+    /// A value of a row of the message.
+    void addNeighbour(ChartedLeaf& series, double value);
     void classify();
     void setBands(const MessageReport& report);
     void forget(Time time);
@@ -82,12 +92,14 @@ private:
     std::array<TimeShares, 2> _shares;
     std::vector<Use> _uses; ///< by the leaf's index
     std::deque<ChartedLeaf> _series;
+    std::vector<ChartedLeaf*> _neighbourSeries; ///< that the current message has values of
     StateBand _technologyBand{"radio technology"};
     StateBand _modeBand{"mode"};
     StateBand _radioBand{"radio state"};
     StateBand _classBand{"level class"};
     StateBand _registrationBand{"registration"};
     StateBand _cellBand{"serving cell"};
+    States _bandStates;                              ///< that the bands have
     std::uint32_t _bandCell = ServingCells::unknown; ///< the cell's number, in that band
     std::optional<LevelClass> _class;                ///< of the serving cell's level
     std::optional<RadioTechnology> _classTechnology; ///< that it is for
