@@ -128,7 +128,7 @@ void TechnologyTables::set(TableWriter& table, std::size_t column, const Observa
     switch (observation.kind) {
     case ObservedKind::Number: table.column(column).setNumber(row, observation.number); break;
     case ObservedKind::Enumeration:
-        setText(table, column, _text.of(observation));
+        setEnumeration(table.column(column), row, observation);
         table.column(column + 1).setInteger(row, observation.raw);
         break;
     case ObservedKind::Text: setText(table, column, observation.words); break;
@@ -140,6 +140,25 @@ void TechnologyTables::set(TableWriter& table, std::size_t column, const Observa
         break;
     case ObservedKind::Absent: break;
     }
+}
+
+/// The text of a raw number is made once, and looked up by the number: most are of a few.
+void TechnologyTables::setEnumeration(ColumnBuilder& column, std::uint32_t row,
+                                      const Observation& observation) {
+    const bool isOfRaw = observation.text == Observation::Text::OfRaw && observation.source;
+    const ColumnBuilder::TextSource source{isOfRaw ? &observation.source->field->format : nullptr,
+                                           observation.raw};
+    if (isOfRaw)
+        if (const std::optional<std::size_t> size = column.setTextOf(row, source)) {
+            _message.textBytes += *size;
+            return;
+        }
+    const std::string_view text = _text.of(observation);
+    _message.textBytes += text.size();
+    if (isOfRaw)
+        column.setText(row, validText(text, _storage), source, text.size());
+    else
+        column.setText(row, validText(text, _storage));
 }
 
 void TechnologyTables::setText(TableWriter& table, std::size_t column, std::string_view text) {

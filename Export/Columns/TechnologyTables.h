@@ -61,6 +61,7 @@ private:
     void addMessage(const RowContext& context, bool isDecoded);
     void add(const RowContext& context, const Observation& observation);
     void set(TableWriter& table, std::size_t column, const Observation& observation);
+    void setEnumeration(ColumnBuilder& column, std::uint32_t row, const Observation& observation);
     void setText(TableWriter& table, std::size_t column, std::string_view text);
     [[nodiscard]] RowContext contextOf(const ObservedMessage& message) const;
 

@@ -26,6 +26,7 @@ struct ChartedLeaf {
     bool isNeighbour;                   ///< of the rows of a message the best one alone is shown
     std::optional<std::uint32_t> input; ///< whose values these are, where two are compared
     SeriesBuckets buckets;
+    std::optional<double> best = {}; ///< of the rows of the current message so far
 };
 
 /// The chart that shows the leaf: by its role, otherwise by its unit.

@@ -11,7 +11,7 @@
 #include <cstdint>
 #include <map>
 #include <optional>
-#include <tuple>
+#include <unordered_map>
 
 namespace velmora {
 
@@ -27,6 +27,9 @@ public:
         std::optional<double> channel;
         std::optional<double> physicalCell;
         friend auto operator<=>(const Key&, const Key&) = default;
+    };
+    struct KeyHash {
+        [[nodiscard]] std::size_t operator()(const Key& key) const;
     };
     struct Row {
         std::uint64_t reports = 0;
@@ -48,7 +51,11 @@ public:
     [[nodiscard]] std::uint64_t omitted() const { return _omitted; }
 
 private:
+    /// Null where there are too many.
+    [[nodiscard]] Row* rowOf(const Key& key, const MessageReport& report);
+
     Rows _rows;
+    std::unordered_map<Key, Row*, KeyHash> _found; ///< the same rows: thousands of messages report each
     std::uint64_t _omitted = 0;
 };
 

@@ -21,7 +21,8 @@ std::int64_t SeriesBuckets::indexOf(Time time) const {
     return quotient(time.time_since_epoch().count(), _width.count());
 }
 
-void SeriesBuckets::begin(std::int64_t index) {
+void SeriesBuckets::begin(Time time) {
+    std::int64_t index = indexOf(time);
     while (_buckets.size() >= _most) {
         // Buckets that are there twice, since a clock went back, are no reason to make them wider.
         join();
@@ -42,6 +43,13 @@ void SeriesBuckets::begin(std::int64_t index) {
                             0,
                             {},
                             {}});
+    std::int64_t first = 0;
+    std::int64_t end = 0;
+    // At the ends of all times, what is left of the bucket.
+    const bool isCut = __builtin_mul_overflow(index, _width.count(), &first);
+    _begin = isCut ? Time::min() : Time(std::chrono::nanoseconds(first));
+    const bool isLast = __builtin_add_overflow(first, _width.count(), &end);
+    _end = isCut || isLast ? time : Time(std::chrono::nanoseconds(end));
 }
 
 void SeriesBuckets::join() {

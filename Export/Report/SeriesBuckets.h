@@ -35,10 +35,10 @@ public:
     explicit SeriesBuckets(std::size_t most = usualMost) : _most(most) {}
 
     void add(Time time, double value, MessageNumber message) {
-        const std::int64_t index = indexOf(time);
-        if (_buckets.empty() || _buckets.back().index != index)
-            begin(index);
-        addTo(_buckets.back(), {index, value, value, 1, message, message});
+        // Most values are of the latest bucket, which takes no division to see.
+        if (time < _begin || time >= _end)
+            begin(time);
+        addTo(_buckets.back(), {0, value, value, 1, message, message});
     }
     /// Sorts what was added. Call it before `buckets`.
     void finish();
@@ -51,12 +51,15 @@ public:
 
 private:
     [[nodiscard]] std::int64_t indexOf(Time time) const;
-    void begin(std::int64_t index);
+    /// The bucket of that time is the latest one.
+    void begin(Time time);
     void join();
     static void addTo(Bucket& bucket, const Bucket& other);
 
     std::size_t _most;
     std::chrono::nanoseconds _width = narrowest;
+    Time _begin{}; ///< of the latest bucket; as its end where there is none
+    Time _end{};
     std::vector<Bucket> _buckets; ///< in the order of the messages; a clock may go back
 };
 

@@ -90,23 +90,28 @@ void TechnologyReport::observe(const MessageReport& report) {
             _cells.addLevel(each.number);
         else if (use.role == Role::ServingQuality)
             _cells.addQuality(each.number);
-        if (ChartedLeaf* const series = use.series[group]; series && !series->isNeighbour)
+        ChartedLeaf* const series = use.series[group];
+        if (!series)
+            continue;
+        if (series->isNeighbour)
+            addNeighbour(*series, each.number);
+        else
             series->buckets.add(report.time, each.number, report.message);
     }
-    if (!hasNeighbour)
-        return;
-    for (ChartedLeaf& series : _series) {
-        if (!series.isNeighbour || series.input.value_or(0) != group)
-            continue;
-        const Observation* best = nullptr;
-        for (const Observation& each : report.observed.observations)
-            if (each.leaf == series.leaf && each.kind == ObservedKind::Number && std::isfinite(each.number) &&
-                (!best || each.number > best->number))
-                best = &each;
-        if (best)
-            series.buckets.add(report.time, best->number, report.message);
+    for (ChartedLeaf* const series : _neighbourSeries) {
+        if (hasNeighbour)
+            series->buckets.add(report.time, *series->best, report.message);
+        series->best.reset();
     }
-    _neighbours.report(report, _engine.picture());
+    _neighbourSeries.clear();
+    if (hasNeighbour)
+        _neighbours.report(report, _engine.picture());
+}
+
+void TechnologyReport::addNeighbour(ChartedLeaf& series, double value) {
+    if (!series.best)
+        _neighbourSeries.push_back(&series);
+    series.best = series.best ? std::max(*series.best, value) : value;
 }
 
 void TechnologyReport::classify() {
@@ -132,11 +137,16 @@ void TechnologyReport::setBands(const MessageReport& report) {
         return value ? std::optional<std::string_view>(nameOf(*value)) : std::nullopt;
     };
     Bands& bands = _bands[groupOf(report.message)];
-    bands.technology.set(report.time, nameOfAny(picture.technology()));
-    bands.mode.set(report.time, nameOfAny(picture.mode()));
+    // Names are compared where the states are others.
+    const States states{picture.technology(), picture.mode(), _class};
+    if (states != bands.states) {
+        bands.technology.set(report.time, nameOfAny(states.technology));
+        bands.mode.set(report.time, nameOfAny(states.mode));
+        bands.levelClass.set(report.time, nameOfAny(states.levelClass));
+        bands.states = states;
+    }
     bands.radio.set(report.time, textOf(Role::RadioState));
     bands.registration.set(report.time, textOf(Role::RegistrationState));
-    bands.levelClass.set(report.time, nameOfAny(_class));
     // By number: what is known of a cell, and so its name, grows while it serves.
     if (_cells.number() == _bandCell)
         return;
@@ -150,9 +160,11 @@ void TechnologyReport::setBands(const MessageReport& report) {
 }
 
 void TechnologyReport::endBands(Time time) {
-    for (Bands& bands : _bands)
+    for (Bands& bands : _bands) {
         for (StateBand* const band : bands.all())
             band->end(time);
+        bands.states = {};
+    }
     _bandCell = ServingCells::unknown;
 }
 

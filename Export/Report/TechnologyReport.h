@@ -71,6 +71,15 @@ private:
         Role role = Role::None;
         std::array<ChartedLeaf*, 2> series{}; ///< by group
     };
+
+    /// What bands show by name.
+    struct States {
+        std::optional<RadioTechnology> technology = {};
+        std::optional<RadioMode> mode = {};
+        std::optional<LevelClass> levelClass = {};
+        friend bool operator==(const States&, const States&) = default;
+    };
+
     struct Bands {
         StateBand technology{"radio technology"};
         StateBand levelClass{"level class"};
@@ -78,6 +87,7 @@ private:
         StateBand radio{"radio state"};
         StateBand registration{"registration"};
         StateBand cell{"serving cell"};
+        States states; ///< that they have
 
         [[nodiscard]] std::array<StateBand*, 6> all() {
             return {&technology, &levelClass, &mode, &radio, &registration, &cell};
@@ -91,6 +101,8 @@ private:
     void beginInput();
     [[nodiscard]] std::chrono::nanoseconds pass(Time time);
     void observe(const MessageReport& report);
+    /// A value of a row of the message.
+    void addNeighbour(ChartedLeaf& series, double value);
     void classify();
     void setBands(const MessageReport& report);
     void endBands(Time time);
@@ -106,6 +118,7 @@ private:
     std::array<TimeShares, 2> _shares;
     std::vector<Use> _uses; ///< by the leaf's index
     std::deque<ChartedLeaf> _series;
+    std::vector<ChartedLeaf*> _neighbourSeries;      ///< that the current message has values of
     std::array<Bands, 2> _bands;                     ///< by group
     std::uint32_t _bandCell = ServingCells::unknown; ///< the cell's number, in its band
     std::deque<StartContexts> _startContexts;

@@ -19,6 +19,7 @@ public:
         _report.count(report.message, report.time);
         _technology.report(report);
     }
+    [[nodiscard]] bool wantsRowKeys() const override { return false; }
     void reportUndecoded(const UndecodedReport& report) override {
         _report.count(report.message, report.time);
         _technology.reportUndecoded(report.message, report.time, report.arrival);

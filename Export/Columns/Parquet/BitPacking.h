@@ -17,8 +17,9 @@ public:
 
     /// Precondition: the value fits in `width` bits, at most 64.
     void put(std::uint64_t value, unsigned width) {
-        if (_bits == 0 && width == 8) { // as most are
-            _out.push_back(static_cast<std::uint8_t>(value));
+        if (_bits == 0 && width % 8 == 0) { // whole bytes, as most are
+            for (; width > 0; width -= 8, value >>= 8)
+                _out.push_back(static_cast<std::uint8_t>(value));
             return;
         }
         _pending |= static_cast<Wide>(value) << _bits;

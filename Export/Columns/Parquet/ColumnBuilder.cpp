@@ -47,6 +47,24 @@ void ColumnBuilder::setText(std::uint32_t row, std::string_view value) {
     appendPlain(_plainBytes, value);
 }
 
+std::optional<std::size_t> ColumnBuilder::setTextOf(std::uint32_t row, const TextSource& source) {
+    const auto slot = static_cast<std::size_t>(source.raw) % _textsOfRaw.size();
+    const TextOfRaw& known = _textsOfRaw[slot];
+    if (_isPlain || known.source != source)
+        return std::nullopt;
+    setPresent(row);
+    _indices.push_back(known.index);
+    return known.size;
+}
+
+void ColumnBuilder::setText(std::uint32_t row, std::string_view value, const TextSource& source,
+                            std::size_t size) {
+    setText(row, value);
+    if (!_isPlain)
+        _textsOfRaw[static_cast<std::size_t>(source.raw) % _textsOfRaw.size()] = {source, _indices.back(),
+                                                                                  size};
+}
+
 void ColumnBuilder::setFlag(std::uint32_t row, bool value) {
     setPresent(row);
     _plainBytes.push_back(value ? 1 : 0);
@@ -165,8 +183,7 @@ void ColumnBuilder::addIndices(EncodedChunk& chunk, std::size_t entries) const {
     chunk.dictionaryValues = entries;
     const unsigned width = indexWidth(entries);
     RunEncoder runs(width);
-    for (const std::uint16_t index : _indices)
-        runs.put(index);
+    runs.put(_indices);
     chunk.data.push_back(static_cast<std::uint8_t>(width));
     const std::vector<std::uint8_t>& encoded = runs.finish();
     chunk.data.insert(chunk.data.end(), encoded.begin(), encoded.end());

@@ -9,9 +9,11 @@
 #include "Export/Columns/Parquet/TextDictionary.h"
 #include "Export/Columns/Parquet/WordDictionary.h"
 
+#include <array>
 #include <bit>
 #include <cstddef>
 #include <cstdint>
+#include <optional>
 #include <string_view>
 #include <vector>
 
@@ -39,6 +41,17 @@ public:
         setWord(row, static_cast<std::uint64_t>(value));
     }
     void setText(std::uint32_t row, std::string_view value);
+    /// What a text is made from: the same makes the same text.
+    struct TextSource {
+        const void* format = nullptr;
+        std::int64_t raw = 0;
+        friend bool operator==(const TextSource&, const TextSource&) = default;
+    };
+    /// The same, which `setTextOf` finds again. `size` is what that returns.
+    void setText(std::uint32_t row, std::string_view value, const TextSource& source, std::size_t size);
+    /// Sets the text that an earlier row has got from the same source; absent, and nothing done, where that
+    /// is not known any more.
+    [[nodiscard]] std::optional<std::size_t> setTextOf(std::uint32_t row, const TextSource& source);
     void setFlag(std::uint32_t row, bool value);
     /// The same text in each of so many rows. Precondition: none has a value.
     void setAllTexts(std::uint32_t rows, std::string_view value);
@@ -74,6 +87,12 @@ private:
     void addValues(EncodedChunk& chunk);
     void addIndices(EncodedChunk& chunk, std::size_t entries) const;
 
+    struct TextOfRaw {
+        TextSource source;
+        std::uint16_t index = 0; ///< in the dictionary
+        std::size_t size = 0;
+    };
+
     TableColumn _column;
     std::uint32_t _rows = 0;
     std::uint32_t _present = 0; ///< of the rows at the end, those that the levels lack
@@ -82,6 +101,7 @@ private:
     bool _isPlain = false;
     WordDictionary _words;
     TextDictionary _texts;
+    std::array<TextOfRaw, 8> _textsOfRaw; ///< the latest of each remainder of the raw number
     std::vector<std::uint16_t> _indices;
     std::vector<std::uint64_t> _plainWords;
     std::vector<std::uint8_t> _plainBytes; ///< texts with their lengths; flags

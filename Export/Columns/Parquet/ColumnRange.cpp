@@ -24,17 +24,26 @@ std::string stored(std::uint64_t word) {
 } // namespace
 
 void ColumnRange::add(std::span<const std::uint64_t> words) {
-    for (const std::uint64_t word : words) {
-        const auto integer = static_cast<std::int64_t>(word);
-        const double number = std::bit_cast<double>(word);
-        if (_type == StoredType::Number && std::isnan(number))
-            continue;
-        _leastInteger = _isEmpty ? integer : std::min(_leastInteger, integer);
-        _greatestInteger = _isEmpty ? integer : std::max(_greatestInteger, integer);
-        _leastNumber = _isEmpty ? number : std::min(_leastNumber, number);
-        _greatestNumber = _isEmpty ? number : std::max(_greatestNumber, number);
-        _isEmpty = false;
-    }
+    if (_type == StoredType::Number)
+        for (const std::uint64_t word : words)
+            addNumber(std::bit_cast<double>(word));
+    else
+        for (const std::uint64_t word : words)
+            addInteger(static_cast<std::int64_t>(word));
+}
+
+void ColumnRange::addInteger(std::int64_t integer) {
+    _leastInteger = _isEmpty ? integer : std::min(_leastInteger, integer);
+    _greatestInteger = _isEmpty ? integer : std::max(_greatestInteger, integer);
+    _isEmpty = false;
+}
+
+void ColumnRange::addNumber(double number) {
+    if (std::isnan(number))
+        return;
+    _leastNumber = _isEmpty ? number : std::min(_leastNumber, number);
+    _greatestNumber = _isEmpty ? number : std::max(_greatestNumber, number);
+    _isEmpty = false;
 }
 
 void ColumnRange::add(std::string_view text) {

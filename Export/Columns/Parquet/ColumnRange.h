@@ -25,6 +25,9 @@ public:
     [[nodiscard]] decltype(ColumnStatistics::range) result() const;
 
 private:
+    void addInteger(std::int64_t integer);
+    void addNumber(double number);
+
     StoredType _type;
     bool _isEmpty = true;
     std::int64_t _leastInteger = 0;

@@ -16,6 +16,35 @@ void RunEncoder::put(std::uint32_t value, std::size_t count) {
     _repeats += count;
 }
 
+void RunEncoder::put(std::span<const std::uint16_t> values) {
+    std::size_t i = 0;
+    while (i < values.size()) {
+        if (_grouped != 0 || values.size() - i < groupSize) {
+            put(values[i++]);
+        } else if (_repeats >= groupSize) {
+            if (values[i] == _current) {
+                ++_repeats;
+                ++i;
+            } else {
+                endRun();
+            }
+        } else {
+            // The next eight are a group of their own.
+            const std::span<const std::uint16_t> next = values.subspan(i, groupSize);
+            i += groupSize;
+            _current = next.back();
+            if (std::all_of(next.begin(), next.end(),
+                            [this](std::uint16_t value) { return value == _current; })) {
+                _repeats = groupSize;
+                endPacked();
+                continue;
+            }
+            std::copy(next.begin(), next.end(), _group.begin());
+            packGroup();
+        }
+    }
+}
+
 void RunEncoder::putNext(std::uint32_t value) {
     if (value != _current || _repeats == 0) {
         if (_repeats >= groupSize)
@@ -36,6 +65,10 @@ void RunEncoder::endGroup() {
         _grouped = 0;
         return;
     }
+    packGroup();
+}
+
+void RunEncoder::packGroup() {
     if (_packedGroups == 0) {
         _packedHeader = _out.size();
         _out.push_back(0);

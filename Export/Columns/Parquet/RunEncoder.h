@@ -6,6 +6,7 @@
 #include <array>
 #include <cstddef>
 #include <cstdint>
+#include <span>
 #include <vector>
 
 namespace velmora {
@@ -24,6 +25,8 @@ public:
         putNext(value);
     }
     void put(std::uint32_t value, std::size_t count);
+    /// As one by one, but faster.
+    void put(std::span<const std::uint16_t> values);
 
     /// Everything that was put; nothing can be put afterwards. The last group may have further zeros.
     [[nodiscard]] const std::vector<std::uint8_t>& finish();
@@ -34,6 +37,7 @@ private:
 
     void putNext(std::uint32_t value);
     void endGroup();
+    void packGroup();
     void endPacked();
     void endRun();
 

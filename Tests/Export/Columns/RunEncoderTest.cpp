@@ -8,6 +8,10 @@
 #include <gmock/gmock.h>
 #include <rapidcheck/gtest.h>
 
+#include <span>
+#include <utility>
+#include <vector>
+
 namespace velmora {
 namespace {
 
@@ -99,6 +103,20 @@ RC_GTEST_PROP(RunEncoder, isReadBack, ()) {
                 encoder.put(value);
     }
     RC_ASSERT(decoded(encoder.finish(), width, values.size()) == values);
+}
+
+RC_GTEST_PROP(RunEncoder, encodesManyAsOneByOne, ()) {
+    const auto runs = *rc::gen::container<std::vector<std::pair<std::uint16_t, std::uint8_t>>>(
+        rc::gen::pair(rc::gen::inRange<std::uint16_t>(0, 3), rc::gen::inRange<std::uint8_t>(1, 30)));
+    std::vector<std::uint16_t> values;
+    for (const auto& [value, count] : runs)
+        values.insert(values.end(), count, value);
+    const auto first = *rc::gen::inRange<std::size_t>(0, values.size() + 1);
+    RunEncoder encoder(8);
+    for (std::size_t i = 0; i < first; ++i)
+        encoder.put(values[i]);
+    encoder.put(std::span(std::as_const(values)).subspan(first));
+    RC_ASSERT(encoder.finish() == encoded(8, {values.begin(), values.end()}));
 }
 
 } // namespace

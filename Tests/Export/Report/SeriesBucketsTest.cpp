@@ -33,6 +33,19 @@ TEST(SeriesBuckets, KeepsExtremesWithTheMessagesThatReportedThem) {
     EXPECT_EQ(series.buckets()[1].index, 1); // 125 ms each
 }
 
+TEST(SeriesBuckets, KeepValuesAtTheEndsOfAllTimes) {
+    SeriesBuckets series;
+    for (const std::uint64_t number : {1U, 2U})
+        series.add(Time::min(), static_cast<double>(number), {0, number});
+    for (const std::uint64_t number : {3U, 4U})
+        series.add(Time::max(), static_cast<double>(number), {0, number});
+    series.finish();
+    ASSERT_EQ(series.buckets().size(), 2U);
+    EXPECT_EQ(series.buckets()[0].maximum, 2);
+    EXPECT_EQ(series.buckets()[1].minimum, 3);
+    EXPECT_EQ(series.buckets()[1].count, 2U);
+}
+
 TEST(SeriesBuckets, BecomeWiderWhenThereAreTooManyAndLoseNoExtreme) {
     SeriesBuckets series(8);
     for (int i = 0; i < 1000; ++i)
