@@ -7,6 +7,7 @@
 #include "App/MaskingModel.h"
 #include "App/Playback/PlaybackController.h"
 #include "App/Recording/RecordingSwitch.h"
+#include "App/Report/ReportSwitch.h"
 #include "App/VelmoraPaneController.h"
 #include "App/VelmoraSaveViewController.h"
 #include "Model/NodePath.h"
@@ -31,12 +32,6 @@ constexpr const char* internalInstallMarker =
 constexpr const char* homeScreenDomain = "com.velmora.HomeScreen";
 constexpr const char* showGSMRSSIKey = "LantheShowGSMRSSI";
 constexpr const char* connecting = "Connecting...";
-constexpr char privacyKey = 'M';
-constexpr char driveKey = 'D';
-constexpr char pinKey = 'P';
-constexpr char closeKey = 'W';
-constexpr char recordKey = 'R';
-constexpr char noteKey = 'B';
 /// How long a notice names a snapshot: time enough to read a path, and to hear it read.
 constexpr std::chrono::seconds snapshotNoticeTime{60};
 constexpr const char* maskedNotice = "Identities are masked. Ctrl-M shows them.";
@@ -65,6 +60,7 @@ void VelmoraApp::applicationDidFinishLaunching(Application&) {
     makeRecordingSwitch();
     _drive = std::make_unique<DriveScreen>(*_platform, [this] { return _model && _model->isConnected(); });
     _model->setDrive(&_drive->model());
+    setDriveActions();
     setUpdateMessage(connecting);
     _dateFormatter =
         std::make_unique<DateFormatter>(_platform->model().clock, "'Updated' yyyy-MM-dd 'at' HH:mm:ss");
@@ -75,13 +71,7 @@ void VelmoraApp::applicationDidFinishLaunching(Application&) {
     _window->setRootViewController(_drive->standBeside(_navController));
     if (_beginsWithDrive)
         _drive->open();
-    _window->setCommand(privacyKey, [this] { togglePrivacy(); });
-    _window->setCommand(driveKey, [this] { _drive->toggle(); });
-    _window->setCommand(pinKey, [this] { pinFocusRow(); });
-    _window->setCommand(closeKey, [this] { closeRecording(); });
-    _window->setCommand(recordKey,
-                        [this] { _recording->toggle(_model->technology(), _model->isConnected()); });
-    _window->setCommand(noteKey, [this] { _recording->askNote(); });
+    setCommands();
     _window->setOnDrop([this](const std::string& path) { openRecording(path); });
     updateNotice();
     _window->makeKeyAndVisible();
@@ -116,6 +106,7 @@ void VelmoraApp::applicationWillTerminate() {
     if (_window)
         _window->setHidden(true);
     _recording->stop();
+    _report.reset();
     _navController->setAccessories({});
     _drive->setRecorded(nullptr);
     _playback.reset();
@@ -196,6 +187,7 @@ void VelmoraApp::togglePrivacy() {
     _privacy->setOn(!_privacy->isOn());
     // A recording holds identities or pseudonyms, never both.
     _recording->stop("identities are masked otherwise now");
+    _report->cancel();
     // What was decoded so far is in the decoder, the tree, the panes and the save screen's copy.
     _endsOnceSaved = false;
     closeSaveView();
@@ -211,11 +203,6 @@ void VelmoraApp::togglePrivacy() {
         return;
     _window->displayIfNeeded(); // the connection may block for seconds
     _platform->model().queue.async([model = _model] { model->restartMonitor(); });
-}
-
-void VelmoraApp::pinFocusRow() {
-    if (_model)
-        static_cast<VelmoraPaneController&>(*_navController->topViewController()).togglePinOfFocusRow();
 }
 
 void VelmoraApp::clearPanes() {
@@ -280,7 +267,8 @@ void VelmoraApp::connectionChanged() {
 }
 
 void VelmoraApp::updateNotice() {
-    Notice notice = _snapshotNotice.before(_playback ? _playback->notice() : connectionNotice());
+    Notice notice =
+        _report->before(_snapshotNotice.before(_playback ? _playback->notice() : connectionNotice()));
     if (const std::string recorded = _recording->notice(); !recorded.empty())
         notice.text = notice.text.empty() ? recorded : recorded + " " + notice.text;
     if (_privacy->isOn())

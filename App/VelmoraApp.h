@@ -28,6 +28,7 @@ class MaskingModel;
 class NavigationController;
 class PlaybackController;
 class RecordingSwitch;
+class ReportSwitch;
 class VelmoraPaneController;
 class VelmoraSaveViewController;
 class Window;
@@ -82,6 +83,12 @@ public:
     [[nodiscard]] RecordingSwitch& recording() const { return *_recording; }
     /// The recording that is shown; null for what is received.
     [[nodiscard]] PlaybackController* playback() const { return _playback.get(); }
+
+    /// "Report...": asks how, and has a page made of the recording that is shown or, without one, of the one
+    /// that is being made.
+    void askReport();
+    /// Precondition: the application has launched.
+    [[nodiscard]] ReportSwitch& report() const { return *_report; }
 
     /// Masks identities, or shows them again: on the panes, on the save screen and in what that writes.
     /// The panes begin empty, with a new connection, so that nothing decoded before is shown.
@@ -153,6 +160,8 @@ private:
     /// Puts the bars of recordings that are played and made below the panes.
     void showBars();
     void makeRecordingSwitch();
+    void setCommands();
+    void setDriveActions();
     /// What the bar above the panes says: that identities are masked, and the connection's problem or that
     /// the panes do not show what is received.
     void updateNotice();
@@ -172,6 +181,7 @@ private:
     std::string _recordingTechnology;
     std::unique_ptr<PlaybackController> _playback;
     std::unique_ptr<RecordingSwitch> _recording;
+    std::unique_ptr<ReportSwitch> _report;
     std::unique_ptr<DateFormatter> _dateFormatter;
     [[maybe_unused]] std::string _updateMessage; ///< unused: the property has the text
     Properties _properties;

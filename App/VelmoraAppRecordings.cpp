@@ -5,11 +5,13 @@
 #include "App/MaskingModel.h"
 #include "App/Playback/PlaybackController.h"
 #include "App/Recording/RecordingSwitch.h"
+#include "App/Report/ReportSwitch.h"
 #include "App/VelmoraApp.h"
 #include "App/VelmoraPaneController.h"
 #include "Platform/PrintableText.h"
 #include "Platform/SystemLog.h"
 #include "Toolkit/Alert.h"
+#include "Toolkit/Folder.h"
 #include "Toolkit/Navigation/NavigationController.h"
 
 #include <utility>
@@ -21,13 +23,33 @@ namespace velmora {
 
 void VelmoraApp::makeRecordingSwitch() {
     _recording = std::make_unique<RecordingSwitch>(
-        *_platform, [this] { showBars(); }, [this] { updateNotice(); });
+        *_platform, [this] { showBars(); }, [this] { updateNotice(); },
+        [this](const std::string& text) { _drive->model().noted(text); });
+    _report =
+        std::make_unique<ReportSwitch>(*_platform, ReportSwitch::Host{[this] { updateNotice(); }, openPage});
     const auto model = std::make_shared<MaskingModel>(_platform->model(), this, *_privacy);
     model->setOnShown([this](const Data& message) {
         if (_recording)
             _recording->take(message);
     });
     _model = model;
+}
+
+void VelmoraApp::setDriveActions() {
+    _drive->controller().setActions(
+        {[this] { _recording->toggle(_model->technology(), _model->isConnected()); },
+         [this] { _recording->bookmark(); }, [this] { askReport(); }, [this] { return _recording->isOn(); }});
+}
+
+void VelmoraApp::askReport() {
+    if (!_model) // shut down
+        return;
+    PlayedDecoder::Masking masking;
+    if (_privacy->isOn())
+        masking = [this](const LoggedMessage& message, std::string_view shown) {
+            return _privacy->shown(message.message, shown, message.time);
+        };
+    _report->ask(_playback ? _playback->path() : _recording->file(), std::move(masking));
 }
 
 void VelmoraApp::showBars() {
@@ -37,6 +59,7 @@ void VelmoraApp::showBars() {
     if (RecordingBar* const bar = _recording->bar())
         bars.push_back(bar);
     _navController->setAccessories(std::move(bars));
+    _drive->controller().recordingChanged();
 }
 
 void VelmoraApp::openRecording(const std::string& path, const std::string& technology) {

@@ -1,6 +1,7 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
+#include "App/DriveView/DriveScreen.h"
 #include "App/LinuxAppPlatform.h"
 #include "App/VelmoraApp.h"
 #include "App/VelmoraPaneController.h"
@@ -27,6 +28,7 @@
 #include <fstream>
 #include <memory>
 #include <string>
+#include <sys/resource.h>
 #include <sys/wait.h>
 #include <unistd.h>
 #include <vector>
@@ -34,11 +36,15 @@
 // What the application costs beside the floor of a bare Qt window with a table of as many rows, in the same
 // run: start to the first painted window, memory, and a redraw of 400 rows whose values have all changed.
 // Each start is a process of its own. Then, with "--flood SECONDS" and velmora-telephonyd sending at a speed
-// of its own, the event loop's latency.
+// of its own, the event loop's latency, processor time and memory; "--idle SECONDS" leaves out the latency,
+// whose probe wakes the process itself. With "--drive" the drive view stands beside the panes, in a window of
+// 1280 by 800 points.
 //
-//   QT_QPA_PLATFORM=offscreen bench-application
+//   QT_QPA_PLATFORM=offscreen bench-application [--drive]
 //   velmora-telephonyd --source scenario:gsm,seed=1,speed=520 &
-//   QT_QPA_PLATFORM=offscreen bench-application --flood 60
+//   QT_QPA_PLATFORM=offscreen bench-application --flood 60 [--drive]
+//   velmora-telephonyd --source scenario:gsm,seed=1 &
+//   QT_QPA_PLATFORM=offscreen bench-application --idle 60 [--drive]
 
 namespace velmora {
 namespace {
@@ -152,7 +158,22 @@ Data displayMessage(int rows, int round) {
     return serialized(display);
 }
 
-Figures application(int argc, char** argv, std::int64_t begun_us) {
+/// Makes the window so wide that the drive view stands beside the panes.
+void widen() {
+    for (QWidget* const each : QApplication::topLevelWidgets())
+        each->resize(1280, 800);
+}
+
+double processorTime_ms() {
+    rusage usage = {};
+    ::getrusage(RUSAGE_SELF, &usage);
+    const auto milliseconds = [](const timeval& time) {
+        return static_cast<double>(time.tv_sec) * 1000 + static_cast<double>(time.tv_usec) / 1000;
+    };
+    return milliseconds(usage.ru_utime) + milliseconds(usage.ru_stime);
+}
+
+Figures application(int argc, char** argv, std::int64_t begun_us, bool hasDrive) {
     BenchPlatform* platform = nullptr;
     VelmoraApp app(argc, argv, [&platform] {
         auto made = std::make_unique<BenchPlatform>();
@@ -171,6 +192,8 @@ Figures application(int argc, char** argv, std::int64_t begun_us) {
         return answer;
     });
     app.applicationDidFinishLaunching(app);
+    if (hasDrive)
+        widen();
     platform->queue.runPending();
     while (!app.model().isConnected()) // which takes a window that is on the screen
         QApplication::processEvents(QEventLoop::WaitForMoreEvents);
@@ -218,13 +241,15 @@ double median(std::vector<double> values) {
     return values[rounds / 2];
 }
 
-int compare() {
+int compare(bool hasDrive) {
     std::vector<double> starts[2];
     std::vector<double> residents[2];
     std::vector<double> redraws[2];
     for (int round = 0; round < rounds; ++round)
         for (int which = 0; which < 2; ++which) {
-            const Figures figures = measure(which == 0 ? "--floor" : "--velmora");
+            const Figures figures = measure(which == 0 ? "--floor"
+                                            : hasDrive ? "--velmora-drive"
+                                                       : "--velmora");
             starts[which].push_back(figures.start_ms);
             residents[which].push_back(figures.resident_MiB);
             redraws[which].push_back(figures.redraw_ms);
@@ -242,7 +267,8 @@ int compare() {
     return 0;
 }
 
-int flood(int argc, char** argv, int seconds) {
+/// How the application does while messages arrive. `probes`: whether the event loop's latency is measured.
+int run(int argc, char** argv, int seconds, bool probes, bool hasDrive) {
     FileResources files;
     setResources(&files);
     VelmoraApp app(argc, argv, [] {
@@ -259,9 +285,32 @@ int flood(int argc, char** argv, int seconds) {
             late_ms.push_back(static_cast<double>(since.nsecsElapsed()) / 1e6 - 10);
         since.start();
     });
-    probe.start();
-    QTimer::singleShot(seconds * 1000, [&app] { app.terminate(); });
+    if (probes)
+        probe.start();
+    // The start is measured by itself: these figures begin when the screens are up and the charts have some
+    // samples.
+    constexpr int settled_ms = 5000;
+    double begun_ms = 0;
+    double used_ms = 0;
+    QTimer::singleShot(0, [hasDrive] {
+        if (hasDrive)
+            widen();
+    });
+    QTimer::singleShot(settled_ms, [&] {
+        begun_ms = processorTime_ms();
+        late_ms.clear();
+    });
+    QTimer::singleShot(settled_ms + seconds * 1000, [&] {
+        used_ms = processorTime_ms() - begun_ms;
+        std::printf("connected: %s; drive view: %s; messages in it: %llu\n",
+                    app.model().isConnected() ? "yes" : "no", app.drive().isShown() ? "shown" : "hidden",
+                    static_cast<unsigned long long>(app.drive().model().messages()));
+        app.terminate();
+    });
     const int status = app.run();
+    std::printf("share of a core: %.2f %%; resident: %.1f MiB\n", used_ms / (10.0 * seconds), residentMiB());
+    if (!probes)
+        return status;
     std::sort(late_ms.begin(), late_ms.end());
     if (late_ms.empty()) {
         std::fputs("no telephony service answered\n", stderr);
@@ -279,14 +328,19 @@ int flood(int argc, char** argv, int seconds) {
 int main(int argc, char** argv) {
     using namespace velmora;
     redirectConsole(stderr);
-    if (argc == 3 && std::strcmp(argv[1], "--flood") == 0)
-        return flood(argc, argv, std::atoi(argv[2]));
+    const bool hasDrive = argc > 1 && std::strcmp(argv[argc - 1], "--drive") == 0;
+    if (hasDrive)
+        --argc;
+    if (argc == 3 && (std::strcmp(argv[1], "--flood") == 0 || std::strcmp(argv[1], "--idle") == 0))
+        return run(argc, argv, std::atoi(argv[2]), argv[1][2] == 'f', hasDrive);
     if (argc == 3) {
         const std::int64_t begun = std::strtoll(argv[2], nullptr, 10);
         int count = 1;
         const bool floor = std::strcmp(argv[1], "--floor") == 0;
-        const Figures figures = floor ? bareWindow(count, argv, begun) : application(count, argv, begun);
+        const bool drive = std::strcmp(argv[1], "--velmora-drive") == 0;
+        const Figures figures =
+            floor ? bareWindow(count, argv, begun) : application(count, argv, begun, drive);
         return ::write(STDOUT_FILENO, &figures, sizeof figures) == sizeof figures ? 0 : 1;
     }
-    return compare();
+    return compare(hasDrive);
 }

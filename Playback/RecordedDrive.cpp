@@ -3,6 +3,8 @@
 
 #include "Playback/RecordedDrive.h"
 
+#include "Playback/QuietDecoding.h"
+
 #include <algorithm>
 #include <utility>
 
@@ -22,6 +24,7 @@ void RecordedDrive::setIndex(RecordingIndex* index) {
     _index = index;
     if (!index)
         return;
+    const QuietDecoding quiet; // what the decoders say for which rules are read
     _model.reset();
     _model.setDecoder(&index->decoder().decoder());
     index->setPass(this);

@@ -14,4 +14,8 @@ bool openFolder(std::string_view path) {
     return QDesktopServices::openUrl(QUrl::fromLocalFile(toQt(path)));
 }
 
+bool openPage(std::string_view path) {
+    return openFolder(path); // the desktop knows what each file is opened with
+}
+
 } // namespace velmora

@@ -11,4 +11,7 @@ namespace velmora {
 /// manager is up. Needs the application.
 [[nodiscard]] bool openFolder(std::string_view path);
 
+/// Opens the page in the user's browser, as above.
+[[nodiscard]] bool openPage(std::string_view path);
+
 } // namespace velmora

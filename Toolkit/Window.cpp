@@ -138,7 +138,12 @@ void Window::displayIfNeeded() {
 }
 
 void Window::setCommand(char letter, std::function<void()> command) {
-    _impl->widget().commands[letter] = std::move(command); // the number of a letter's key is its code
+    _impl->widget().commands[Qt::CTRL | Qt::Key(letter)] =
+        std::move(command); // a key's number is its letter's
+}
+
+void Window::setShiftCommand(char letter, std::function<void()> command) {
+    _impl->widget().commands[Qt::CTRL | Qt::SHIFT | Qt::Key(letter)] = std::move(command);
 }
 
 void Window::setOnDrop(std::function<void(const std::string& path)> dropped) {

@@ -40,6 +40,8 @@ public:
     /// Calls `command` when Ctrl and the capital letter are pressed, on whatever screen, a modal one
     /// included.
     void setCommand(char letter, std::function<void()> command);
+    /// The same with Shift.
+    void setShiftCommand(char letter, std::function<void()> command);
     /// Calls `dropped` with the path of a file that is dropped on the window, on whatever screen. Several at
     /// once, and what is no file of this machine, are refused.
     void setOnDrop(std::function<void(const std::string& path)> dropped);

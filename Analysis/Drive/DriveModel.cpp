@@ -79,7 +79,7 @@ void DriveModel::undecoded(Time arrival) {
 }
 
 void DriveModel::noted(std::string_view text) {
-    if (_engine)
+    if (_engine && _engine->last()) // otherwise there is no moment that it could be about
         _engine->noted({}, text);
 }
 

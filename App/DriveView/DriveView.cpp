@@ -31,6 +31,7 @@ DriveView::DriveView(DriveSource& source, const Clock& clock)
     _neighbours.setPlaceholder("No neighbour cells have been reported.");
     _neighbours.setColumns(neighbourColumns({}));
     addSubview(_now);
+    addSubview(_buttons);
     for (Label* each : {&_neighboursHeading, &_chartsHeading, &_eventsHeading})
         each->setFont(Font::boldSystemFontOfSize(headingSize));
     addSubview(_neighboursHeading);
@@ -53,6 +54,7 @@ void DriveView::setSource(DriveSource& source) {
     _charts.setSource(source);
     _events.setModel(source.model());
     update();
+    updateEvents();
     updateCharts();
 }
 
@@ -75,16 +77,18 @@ void DriveView::update() {
     if (std::exchange(_columnsOf, known.technology) != known.technology)
         _neighbours.setColumns(neighbourColumns(known.technology));
     _neighbours.setRows(neighbourRows(_source->neighbours(), known, classes, moment));
+    _buttons.update();
     _charts.updateMoment();
-    if (!_source->isRecorded()) // whose list grows by many at once while it is read
-        _events.update();
+}
+
+void DriveView::updateEvents() {
+    _events.update();
 }
 
 void DriveView::updateCharts() {
     const std::string progress = _source->progress();
     changeText(_chartsHeading, progress.empty() ? "Over time" : "Over time, " + progress);
     _charts.update();
-    _events.update();
     if (std::exchange(_panels, _charts.chart().panelCount()) != _charts.chart().panelCount())
         layoutSubviews();
 }
@@ -94,8 +98,8 @@ void DriveView::layoutSubviews() {
     const double heading = std::ceil(sizeOfText("X", _neighboursHeading.font()).height) + gap;
     double charts = _charts.wantedHeight(width);
     double events = _events.heightOfRows(eventRowsShown);
-    const double above =
-        _now.heightForWidth(width) + heading + _neighbours.heightOfRows(neighbourRowsShown) + gap;
+    const double above = _now.heightForWidth(width) + DriveButtons::height + gap + heading +
+                         _neighbours.heightOfRows(neighbourRowsShown) + gap;
     const double needed = above + heading + charts + gap + heading + events;
     if (const double spare = bounds().height - needed; spare > 0) {
         charts += spare * 0.6;
@@ -108,6 +112,8 @@ void DriveView::layoutSubviews() {
         y += height;
     };
     place(_now, _now.heightForWidth(width));
+    place(_buttons, DriveButtons::height);
+    y += gap;
     place(_neighboursHeading, heading, margin);
     place(_neighbours, _neighbours.heightOfRows(neighbourRowsShown));
     y += gap;

@@ -3,6 +3,7 @@
 
 #pragma once
 
+#include "App/DriveView/DriveButtons.h"
 #include "App/DriveView/DriveCharts.h"
 #include "App/DriveView/EventList.h"
 #include "App/DriveView/NowView.h"
@@ -25,11 +26,13 @@ public:
 
     /// Shows what is known.
     void update();
-    /// The same of the charts, which cost more and are drawn less often.
+    /// The same of events and charts, which cost more and are drawn less often.
+    void updateEvents();
     void updateCharts();
     void layoutSubviews() override;
 
     [[nodiscard]] NowView& nowView() { return _now; }
+    [[nodiscard]] DriveButtons& buttons() { return _buttons; }
     [[nodiscard]] GridView& neighbours() { return _neighbours; }
     [[nodiscard]] DriveCharts& charts() { return _charts; }
     [[nodiscard]] EventList& events() { return _events; }
@@ -39,6 +42,7 @@ private:
 
     DriveSource* _source;
     NowView _now;
+    DriveButtons _buttons;
     Label _neighboursHeading{"Neighbours"};
     GridView _neighbours;
     Label _chartsHeading{"Over time"};

@@ -18,6 +18,7 @@ DriveViewController::~DriveViewController() = default;
 std::unique_ptr<View> DriveViewController::loadView() {
     auto view = std::make_unique<DriveView>(*_source, _clock);
     view->setBackgroundColor(Color::ground);
+    view->buttons().setActions(_actions);
     return view;
 }
 
@@ -44,6 +45,11 @@ void DriveViewController::setSource(DriveSource& source) {
     refreshNow();
 }
 
+void DriveViewController::recordingChanged() {
+    if (isViewLoaded())
+        driveView().buttons().update();
+}
+
 void DriveViewController::refreshNow() {
     _revision = _source->revision();
     _second = std::chrono::floor<std::chrono::seconds>(_source->moment());
@@ -54,6 +60,7 @@ void DriveViewController::refreshNow() {
 
 void DriveViewController::showCharts() {
     _charted = _clock.now();
+    driveView().updateEvents();
     driveView().updateCharts();
 }
 
@@ -68,6 +75,9 @@ void DriveViewController::refresh() {
         return; // not even an age has changed
     _shownLink = std::move(link);
     driveView().update();
+    // A recording's list grows by many at once while it is read: it waits for the charts.
+    if (isNewSecond && !_source->isRecorded())
+        driveView().updateEvents();
     const Time now = _clock.now();
     // A clock may also be set back.
     if (now - _charted >= chartInterval || now < _charted)

@@ -9,6 +9,7 @@
 
 #include <memory>
 #include <string>
+#include <utility>
 
 namespace velmora {
 
@@ -28,6 +29,10 @@ public:
     void viewWillDisappear(bool animated) override;
     bool becomeFirstResponder() override;
     void setSource(DriveSource& source);
+    /// Of the view's buttons. Set before it is shown.
+    void setActions(DriveButtons::Actions actions) { _actions = std::move(actions); }
+    /// A recording has begun or ended.
+    void recordingChanged();
     /// Shows everything as it is now.
     void refreshNow();
     /// Precondition: the view is loaded.
@@ -41,6 +46,7 @@ private:
     void showCharts();
 
     DriveSource* _source;
+    DriveButtons::Actions _actions;
     const Clock& _clock;
     MainQueue& _queue;
     std::unique_ptr<Timer> _timer;

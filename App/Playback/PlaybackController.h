@@ -62,6 +62,8 @@ public:
     /// Begins again with the file, at the same moment: messages are masked otherwise now.
     Result<Done> reopen();
 
+    /// Of the recording.
+    [[nodiscard]] const std::string& path() const { return _path; }
     [[nodiscard]] const Player& player() const { return *_player; }
     [[nodiscard]] const RecordingIndex& index() const { return *_index; }
 

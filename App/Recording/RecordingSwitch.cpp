@@ -12,8 +12,10 @@
 namespace velmora {
 
 RecordingSwitch::RecordingSwitch(AppPlatform& platform, std::function<void()> barsChanged,
-                                 std::function<void()> noticeChanged)
-    : _platform(platform), _barsChanged(std::move(barsChanged)), _noticeChanged(std::move(noticeChanged)) {}
+                                 std::function<void()> noticeChanged,
+                                 std::function<void(const std::string& text)> noted)
+    : _platform(platform), _barsChanged(std::move(barsChanged)), _noticeChanged(std::move(noticeChanged)),
+      _noted(std::move(noted)) {}
 
 void RecordingSwitch::toggle(std::string_view technology, bool isConnected) {
     if (isOn())
@@ -39,7 +41,7 @@ void RecordingSwitch::start(std::string_view technology, bool isConnected) {
     _bar = std::make_unique<RecordingBar>(
         RecordingBar::Actions{// Once the button's press is over, which the bar does not outlive.
                               [this] { _platform.model().queue.async([this] { stop(); }); },
-                              [this](const std::string& text) { _recording->note(text); }});
+                              [this](const std::string& text) { note(text); }});
     _barsChanged();
     connectionChanged(technology, isConnected);
     say({});
@@ -78,6 +80,16 @@ void RecordingSwitch::askNote() {
         _bar->askNote();
     else
         say("A note goes into a recording. Ctrl-R starts one.");
+}
+
+void RecordingSwitch::bookmark() {
+    if (_recording)
+        note("Bookmark");
+}
+
+void RecordingSwitch::note(const std::string& text) {
+    _recording->note(text);
+    _noted(text);
 }
 
 void RecordingSwitch::showStatus() {

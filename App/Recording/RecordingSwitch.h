@@ -18,10 +18,10 @@ namespace velmora {
 /// "VelmoraRecording-SECONDS.pcapng". Main thread only.
 class RecordingSwitch {
 public:
-    /// `barsChanged` is called when the bar comes or goes, `noticeChanged` when `notice` may have changed.
-    /// `platform` must outlive it.
+    /// `barsChanged` is called when the bar comes or goes, `noticeChanged` when `notice` may have changed,
+    /// `noted` for each note. `platform` must outlive it.
     RecordingSwitch(AppPlatform& platform, std::function<void()> barsChanged,
-                    std::function<void()> noticeChanged);
+                    std::function<void()> noticeChanged, std::function<void(const std::string& text)> noted);
 
     /// Starts, or stops what has been started. `technology`: the service's, where it is known; `isConnected`:
     /// whether it is there.
@@ -36,6 +36,11 @@ public:
     /// Asks for a note about this moment; without a recording it says that there is none.
     void askNote();
 
+    /// Adds a note without asking for its text: "Bookmark".
+    void bookmark();
+    /// The recording's file; empty while nothing is recorded.
+    [[nodiscard]] std::string file() const { return _recording ? _recording->file() : std::string(); }
+
     /// Null while nothing is recorded.
     [[nodiscard]] RecordingBar* bar() const { return _bar.get(); }
     /// What keeps the recording from being written, or what has been recorded last; empty for neither.
@@ -43,12 +48,14 @@ public:
 
 private:
     void start(std::string_view technology, bool isConnected);
+    void note(const std::string& text);
     void showStatus();
     void say(std::string text);
 
     AppPlatform& _platform;
     std::function<void()> _barsChanged;
     std::function<void()> _noticeChanged;
+    std::function<void(const std::string& text)> _noted;
     std::unique_ptr<RecordingBar> _bar;
     std::unique_ptr<LiveRecording> _recording;
     std::string _outcome;

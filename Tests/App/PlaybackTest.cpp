@@ -257,7 +257,7 @@ TEST_F(PlaybackScreenTest, ADroppedFileIsShownUntilItIsClosed) {
 
 TEST_F(PlaybackScreenTest, FitsAPhoneAndAWideWindow) {
     openPaused(write("a.pcapng", fiveBands()));
-    for (const int width : {360, 800}) {
+    for (const int width : {360, 700}) {
         window()->resize(width, 640);
         runUntilIdle();
         const QWidget* const bar = part("velmora.playback");

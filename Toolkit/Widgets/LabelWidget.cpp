@@ -22,6 +22,8 @@ LabelWidget::LabelWidget() {
 }
 
 void LabelWidget::setTextColor(Color color) {
+    if (color == _color)
+        return;
     _color = color;
     update();
 }

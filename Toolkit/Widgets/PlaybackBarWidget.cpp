@@ -30,6 +30,7 @@ constexpr int speedWidth = 60;
 constexpr int margin = 8;
 /// With less room the slider has a row of its own.
 constexpr int leastWidthOfOneRow = 640;
+constexpr const char* symbolProperty = "velmora.symbol";
 constexpr int sliderSteps = 10'000;
 
 std::optional<PlaybackBar::Command> commandOf(const QKeyEvent& key) {
@@ -87,7 +88,7 @@ QToolButton* PlaybackBarWidget::addButton(const char* name, const QString& title
     button->setObjectName(QString("velmora.playback.") + name);
     button->setAccessibleName(title);
     button->setToolTip(title);
-    button->setIcon(style()->standardIcon(static_cast<QStyle::StandardPixmap>(icon)));
+    setSymbol(*button, icon);
     button->setAutoRaise(true);
     button->setAutoRepeat(command != Command::PlayOrPause);
     button->setFocusPolicy(Qt::StrongFocus);
@@ -95,6 +96,26 @@ QToolButton* PlaybackBarWidget::addButton(const char* name, const QString& title
     QObject::connect(button, &QToolButton::clicked, this, [this, command] { run(command); });
     _buttons.push_back(button);
     return button;
+}
+
+void PlaybackBarWidget::setSymbol(QToolButton& button, int icon) const {
+    button.setProperty(symbolProperty, icon);
+    const QIcon given = style()->standardIcon(static_cast<QStyle::StandardPixmap>(icon));
+    QPixmap symbol = given.pixmap(button.iconSize(), devicePixelRatioF());
+    QPainter painter(&symbol);
+    painter.setCompositionMode(QPainter::CompositionMode_SourceIn);
+    painter.fillRect(QRectF(QPointF(), symbol.deviceIndependentSize()),
+                     palette().color(QPalette::ButtonText));
+    painter.end();
+    button.setIcon(symbol);
+}
+
+void PlaybackBarWidget::changeEvent(QEvent* event) {
+    QWidget::changeEvent(event);
+    if (event->type() != QEvent::PaletteChange && event->type() != QEvent::StyleChange)
+        return;
+    for (QWidget* const each : _buttons)
+        setSymbol(static_cast<QToolButton&>(*each), each->property(symbolProperty).toInt());
 }
 
 void PlaybackBarWidget::addSpeeds(const std::vector<std::string>& speeds) {
@@ -132,7 +153,7 @@ void PlaybackBarWidget::show(const PlaybackBar::Shown& shown) {
     _shown = shown;
     if (shown.isPlaying != wasPlaying) {
         const QString title = shown.isPlaying ? tr("Pause") : tr("Play");
-        _play->setIcon(style()->standardIcon(shown.isPlaying ? QStyle::SP_MediaPause : QStyle::SP_MediaPlay));
+        setSymbol(*_play, shown.isPlaying ? QStyle::SP_MediaPause : QStyle::SP_MediaPlay);
         _play->setAccessibleName(title);
         _play->setToolTip(title);
     }

@@ -36,18 +36,21 @@ protected:
     bool eventFilter(QObject* watched, QEvent* event) override;
     void resizeEvent(QResizeEvent* event) override;
     void paintEvent(QPaintEvent* event) override;
+    void changeEvent(QEvent* event) override;
 
 private:
     using Command = PlaybackBar::Command;
 
     QToolButton* addButton(const char* name, const QString& title, int icon, Command command);
+    /// Shows the style's icon of that number, in the colour of text: styles have dark ones on any ground.
+    void setSymbol(QToolButton& button, int icon) const;
     void addSpeeds(const std::vector<std::string>& speeds);
     void run(Command command) const;
     void takeTime();
     /// Places them in a row; returns where it ends.
     int place(const std::vector<QWidget*>& row, int x, int y) const;
 
-    std::vector<QWidget*> _buttons;
+    std::vector<QWidget*> _buttons; ///< each is a QToolButton
     QToolButton* _play = nullptr;
     QSlider* _slider;
     QLineEdit* _time;

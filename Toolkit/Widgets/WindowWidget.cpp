@@ -95,7 +95,7 @@ void WindowWidget::showEvent(QShowEvent* event) {
 }
 
 bool WindowWidget::runCommand(const QKeyEvent& event) const {
-    const auto found = event.modifiers() == Qt::ControlModifier ? commands.find(event.key()) : commands.end();
+    const auto found = commands.find(event.keyCombination());
     if (found == commands.end())
         return false;
     const std::function<void()> command = found->second; // the call may set another one

@@ -20,11 +20,17 @@ class WindowWidget : public QWidget {
 public:
     WindowWidget();
 
+    struct ByCombination {
+        bool operator()(QKeyCombination one, QKeyCombination other) const {
+            return one.toCombined() < other.toCombined();
+        }
+    };
+
     std::function<void()> onResize;
     std::function<void()> onCancel;
     std::function<void()> onSave;
-    /// Called for Ctrl and a letter (Qt's number of the key), whatever has the keyboard focus.
-    std::map<int, std::function<void()>> commands;
+    /// Called for these keys, whatever has the keyboard focus.
+    std::map<QKeyCombination, std::function<void()>, ByCombination> commands;
     /// Called once, when the window's contents are on the screen.
     std::function<void()> onPainted;
     /// Called with the path of a file that is dropped on the window.

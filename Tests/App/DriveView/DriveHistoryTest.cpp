@@ -47,6 +47,21 @@ TEST(DriveHistoryTest, BandsEndWhereTheNextOneBegins) {
     EXPECT_EQ(bands[2].lane, 1U);
 }
 
+TEST(DriveHistoryTest, EveryRadioTechnologyHasABandThatDiffersFromItsNeighbours) {
+    DriveHistory history;
+    for (std::size_t i = 0; i < radioTechnologies; ++i)
+        history.changed(start + std::chrono::seconds(i), static_cast<RadioTechnology>(i), {});
+    const std::vector<ChartBand> bands = history.bands();
+    ASSERT_EQ(bands.size(), radioTechnologies);
+    std::vector<std::string> labels;
+    for (const ChartBand& each : bands)
+        labels.push_back(each.label);
+    EXPECT_EQ(labels,
+              (std::vector<std::string>{"GSM", "UMTS", "TD-SCDMA", "LTE", "NR", "CDMA2000 1x", "EV-DO"}));
+    for (std::size_t i = 1; i < bands.size(); ++i)
+        EXPECT_NE(bands[i].color, bands[i - 1].color) << bands[i].label;
+}
+
 TEST(DriveHistoryTest, BeginsAnewWhenTheClockGoesBack) {
     DriveHistory history;
     history.sample(servingLevelSeries, start, -80);
