@@ -43,9 +43,9 @@ std::unique_ptr<LogGenerator> DecoderMaker::newDecoder() const {
     return LogGenerator::generatorFromTechnology(_technology, _clock);
 }
 
-bool DecoderSession::update(const Data& message) {
+bool updateDecoder(LogGenerator& decoder, Dictionary& state, const Data& message) {
     try {
-        _decoder->updateState(*_state, message);
+        decoder.updateState(state, message);
         return true;
     } catch (const LogCode_0xFF0000::UnknownDataException&) {
         return false;

@@ -56,6 +56,10 @@ private:
     Value _template; ///< none where the technology has none
 };
 
+/// Decodes one message. False where it is one of those that are meant to end the program: a SIM file that
+/// cannot be read, and what a serialized-object baseband must not send.
+[[nodiscard]] bool updateDecoder(LogGenerator& decoder, Dictionary& state, const Data& message);
+
 /// A reconnection makes a decoder, which takes the time of many messages. Further ones in a script are
 /// ignored.
 inline constexpr int maximumReconnects = 3;
@@ -66,9 +70,8 @@ public:
     explicit DecoderSession(const DecoderMaker& maker)
         : _maker(maker), _state(maker.newState()), _decoder(maker.newDecoder()) {}
 
-    /// Decodes one message. False where it is one of those that are meant to end the program: a SIM file that
-    /// cannot be read, and what a serialized-object baseband must not send.
-    [[nodiscard]] bool update(const Data& message);
+    /// Decodes one message, see `updateDecoder`.
+    [[nodiscard]] bool update(const Data& message) { return updateDecoder(*_decoder, *_state, message); }
     void redraw();
     /// Another decoder continues with the same state.
     void reconnect() { _decoder = _maker.newDecoder(); }

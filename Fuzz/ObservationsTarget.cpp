@@ -1,14 +1,11 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Fuzz/DecoderSession.h"
 #include "Fuzz/FuzzTargets.h"
+#include "Fuzz/FuzzedDecoders.h"
 #include "Fuzz/MessageScript.h"
-#include "LogGenerator/Extra/ExtraPayload.h"
-#include "LogGenerator/GSM/AssertionFailure.h"
 #include "Tests/LogGenerator/Observations/DisplayCheck.h"
 
-#include <array>
 #include <optional>
 
 namespace velmora {
@@ -22,7 +19,7 @@ public:
     void run(Bytes input) override {
         if (input.empty())
             return;
-        const DecoderMaker& maker = _makers[input.front() % std::size(fuzzedTechnologies)];
+        const DecoderMaker& maker = _decoders.of(input.front());
         const DictionaryRef state = maker.newState();
         std::unique_ptr<LogGenerator> decoder = maker.newDecoder();
         static_cast<void>(decoder->generateLogUsingState(*state)); // builds the display
@@ -48,23 +45,14 @@ private:
     static bool expectObserved(LogGenerator& decoder, DisplayCheck& check, Dictionary& state,
                                const Data& message) {
         check.mark(state);
-        try {
-            decoder.updateState(state, message);
-        } catch (const LogCode_0xFF0000::UnknownDataException&) {
+        if (!updateDecoder(decoder, state, message))
             return false;
-        } catch (const AssertionFailure&) {
-            return false;
-        }
         if (const std::vector<std::string> problems = check.problems(state); !problems.empty())
             throw BrokenInvariant(problems.front());
         return true;
     }
 
-    ShippedTemplates _templates;
-    std::array<DecoderMaker, std::size(fuzzedTechnologies)> _makers{
-        DecoderMaker(fuzzedTechnologies[0]), DecoderMaker(fuzzedTechnologies[1]),
-        DecoderMaker(fuzzedTechnologies[2]), DecoderMaker(fuzzedTechnologies[3]),
-        DecoderMaker(fuzzedTechnologies[4]), DecoderMaker(fuzzedTechnologies[5])};
+    FuzzedDecoders _decoders;
 };
 
 } // namespace

@@ -7,6 +7,7 @@
 #include "Recording/Positions/FixAssembler.h"
 #include "Recording/Positions/NMEAWriter.h"
 #include "Recording/Positions/TrackFile.h"
+#include "Tests/Support/Fixes.h"
 
 #include <algorithm>
 #include <chrono>
@@ -87,10 +88,7 @@ std::unique_ptr<FuzzTarget> makePositionTarget() {
 
 FuzzCorpus positionCorpus() {
     FuzzCorpus corpus;
-    Fix fix;
-    fix.time = Time(std::chrono::seconds(1'794'805'200));
-    fix.latitude = -33.5;
-    fix.longitude = 151.25;
+    Fix fix = fixAt(std::chrono::seconds(1'794'805'200), -33.5, 151.25);
     fix.altitude_m = 12.5;
     fix.speed_mps = 23;
     fix.course_degrees = 37.25;

@@ -2,14 +2,11 @@
 // SPDX-License-Identifier: MIT
 
 #include "Export/Report/DriveReport.h"
-#include "Fuzz/DecoderSession.h"
 #include "Fuzz/FuzzTargets.h"
+#include "Fuzz/FuzzedDecoders.h"
 #include "Fuzz/MessageScript.h"
-#include "LogGenerator/Extra/ExtraPayload.h"
-#include "LogGenerator/GSM/AssertionFailure.h"
 #include "Tests/Export/Report/PageCheck.h"
 
-#include <array>
 #include <chrono>
 #include <string>
 
@@ -44,7 +41,7 @@ public:
     void run(Bytes input) override {
         if (input.empty())
             return;
-        const DecoderMaker& maker = _makers[input.front() % std::size(fuzzedTechnologies)];
+        const DecoderMaker& maker = _decoders.of(input.front());
         const DictionaryRef state = maker.newState();
         const std::unique_ptr<LogGenerator> decoder = maker.newDecoder();
         static_cast<void>(decoder->generateLogUsingState(*state)); // builds the display
@@ -57,7 +54,7 @@ public:
         decoder->setObservationSink(&sink);
         MessageScript script(input.subspan(1));
         while (const auto step = script.next())
-            if (step->kind == MessageScript::Kind::Message && !isTaken(*decoder, *state, step->message))
+            if (step->kind == MessageScript::Kind::Message && !updateDecoder(*decoder, *state, step->message))
                 break;
         decoder->setObservationSink(nullptr);
         report.finish();
@@ -68,23 +65,7 @@ public:
     }
 
 private:
-    /// False where the message is meant to end the program.
-    static bool isTaken(LogGenerator& decoder, Dictionary& state, const Data& message) {
-        try {
-            decoder.updateState(state, message);
-        } catch (const LogCode_0xFF0000::UnknownDataException&) {
-            return false;
-        } catch (const AssertionFailure&) {
-            return false;
-        }
-        return true;
-    }
-
-    ShippedTemplates _templates;
-    std::array<DecoderMaker, std::size(fuzzedTechnologies)> _makers{
-        DecoderMaker(fuzzedTechnologies[0]), DecoderMaker(fuzzedTechnologies[1]),
-        DecoderMaker(fuzzedTechnologies[2]), DecoderMaker(fuzzedTechnologies[3]),
-        DecoderMaker(fuzzedTechnologies[4]), DecoderMaker(fuzzedTechnologies[5])};
+    FuzzedDecoders _decoders;
 };
 
 } // namespace

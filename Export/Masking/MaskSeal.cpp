@@ -7,6 +7,7 @@
 
 #include <algorithm>
 #include <array>
+#include <utility>
 
 namespace velmora {
 
@@ -15,6 +16,7 @@ namespace {
 constexpr std::string_view mark = "velmora-mask 1 level=";
 constexpr std::string_view keyMark = " key=";
 constexpr std::string_view digestMark = " messages=";
+constexpr std::string_view positionsMark = " positions=";
 constexpr std::size_t keyLength = 32;
 constexpr std::size_t digestLength = 64;
 
@@ -23,6 +25,17 @@ constexpr std::array<std::uint8_t, 7> reportMark = {'v', 'm', 'a', 's', 'k', 0, 
 
 bool isHexadecimal(std::string_view text) {
     return text.find_first_not_of("0123456789abcdef") == std::string_view::npos;
+}
+
+/// Removes a mark and the digest after it from the beginning of a text; empty where they are not there.
+std::string takeDigest(std::string_view& text, std::string_view digestsMark) {
+    if (!text.starts_with(digestsMark))
+        return {};
+    std::string digest(text.substr(digestsMark.size(), digestLength));
+    if (digest.size() != digestLength || !isHexadecimal(digest))
+        return {};
+    text.remove_prefix(digestsMark.size() + digestLength);
+    return digest;
 }
 
 std::vector<std::uint8_t> bytesOf(std::string_view hexadecimal) {
@@ -41,6 +54,8 @@ std::string MaskSeal::text() const {
     result.append(nameOf(level)).append(keyMark).append(key);
     if (!digest.empty())
         result.append(digestMark).append(digest);
+    if (!positions.empty())
+        result.append(positionsMark).append(positions);
     return result;
 }
 
@@ -52,18 +67,14 @@ std::optional<MaskSeal> MaskSeal::read(std::string_view text) {
     const auto level = maskLevelNamed(text.substr(0, end));
     if (end == std::string_view::npos || !level)
         return std::nullopt;
-    MaskSeal seal{*level, std::string(text.substr(end + keyMark.size(), keyLength)), {}};
+    MaskSeal seal{*level, std::string(text.substr(end + keyMark.size(), keyLength)), {}, {}};
     text.remove_prefix(std::min(end + keyMark.size() + keyLength, text.size()));
     if (seal.key.size() != keyLength || !isHexadecimal(seal.key))
         return std::nullopt;
-    if (text.empty())
-        return seal;
-    if (!text.starts_with(digestMark))
-        return std::nullopt;
-    seal.digest = text.substr(digestMark.size());
-    if (seal.digest.size() != digestLength || !isHexadecimal(seal.digest))
-        return std::nullopt;
-    return seal;
+    seal.digest = takeDigest(text, digestMark);
+    if (!seal.digest.empty())
+        seal.positions = takeDigest(text, positionsMark);
+    return text.empty() ? std::optional(std::move(seal)) : std::nullopt;
 }
 
 std::vector<std::uint8_t> MaskSeal::bytes() const {
@@ -83,8 +94,10 @@ std::optional<MaskSeal> MaskSeal::read(Bytes bytes) {
     bytes = bytes.subspan(reportMark.size());
     if (bytes[0] > static_cast<unsigned>(MaskLevel::All))
         return std::nullopt;
-    return MaskSeal{static_cast<MaskLevel>(bytes[0]), hexadecimalText(bytes.subspan(1, keyLength / 2)),
-                    hexadecimalText(bytes.subspan(1 + keyLength / 2, digestLength / 2))};
+    return MaskSeal{static_cast<MaskLevel>(bytes[0]),
+                    hexadecimalText(bytes.subspan(1, keyLength / 2)),
+                    hexadecimalText(bytes.subspan(1 + keyLength / 2, digestLength / 2)),
+                    {}};
 }
 
 void MessageDigest::add(std::string_view technology, Bytes message) {
@@ -96,6 +109,10 @@ void MessageDigest::add(std::string_view technology, Bytes message) {
     _hash.add(lengths);
     _hash.add(Bytes(reinterpret_cast<const std::uint8_t*>(technology.data()), technology.size()));
     _hash.add(message);
+}
+
+void MessageDigest::addSentence(std::string_view text) {
+    add("NMEA", Bytes(reinterpret_cast<const std::uint8_t*>(text.data()), text.size()));
 }
 
 std::string MessageDigest::text() {

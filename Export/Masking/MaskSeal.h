@@ -15,14 +15,17 @@
 
 namespace velmora {
 
-/// What a masked file says of itself: how it was masked, and a digest of its messages, which shows that they
-/// are still the ones that were written. Pseudonyms look like what they stand for, so nothing else tells them
-/// from identities. A recording has it as comments of its section and of its last block, a snapshot as its
-/// description, a DLF log in the unused rest of its version report.
+/// What a masked file says of itself: how it was masked, and digests of its messages and positions, which
+/// show that they are still the ones that were written. Pseudonyms look like what they stand for, so nothing
+/// else tells them from identities. A recording has it as comments of its section and of its last block, a
+/// snapshot as its description, a DLF log in the unused rest of its version report.
 struct MaskSeal {
     MaskLevel level = MaskLevel::Identity;
     std::string key;    ///< its fingerprint
     std::string digest; ///< empty where it is not known yet: at the beginning of a recording
+    /// The digest of the sentences of positions; empty with the other, in files that cannot have any, and in
+    /// seals of earlier versions, which do not cover them.
+    std::string positions = {};
 
     [[nodiscard]] std::string text() const;
     /// Absent for any other text.
@@ -41,6 +44,8 @@ struct MaskSeal {
 class MessageDigest {
 public:
     void add(std::string_view technology, Bytes message);
+    /// A sentence of positions.
+    void addSentence(std::string_view text);
     /// Of all so far, in hexadecimal; then it begins again.
     [[nodiscard]] std::string text();
 

@@ -42,6 +42,7 @@ Result<Done> MaskedRecording::add(Time time, Bytes message, std::string_view tec
 void MaskedRecording::addSentence(Time time, std::string_view sentence) {
     if (_interfaces.empty())
         return;
+    _sentences.addSentence(sentence);
     const auto found = std::ranges::find(_interfaces, pcapng::positionName);
     const auto index = static_cast<std::uint32_t>(found - _interfaces.begin());
     if (found == _interfaces.end()) {
@@ -56,6 +57,7 @@ Result<Done> MaskedRecording::finish(std::string_view technology) {
     if (_interfaces.empty())
         static_cast<void>(interfaceOf(technology));
     _seal.digest = _digest.text();
+    _seal.positions = _sentences.text();
     pcapngBlocks::appendComment(_buffer, _seal.text());
     return flush();
 }

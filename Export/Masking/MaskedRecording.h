@@ -38,6 +38,7 @@ private:
 
     std::unique_ptr<OutputFile> _file;
     std::string _name;
+    MessageDigest _sentences;
     MaskSeal _seal;
     MessageDigest _digest;
     std::vector<std::string> _interfaces;

@@ -59,11 +59,14 @@ std::optional<MaskSeal> sealOfRecording(ChunkedInput input) {
     const RecordingSeal recording(**reader);
     (*reader)->setReadsAllTechnologies(true);
     MessageDigest digest;
+    MessageDigest sentences;
+    (*reader)->setSentences([&sentences](const PositionSentence& each) { sentences.addSentence(each.text); });
     while (const auto message = (*reader)->next())
         digest.add(technologyOf(*message, **reader), message->message.bytes());
     const std::optional<MaskSeal> seal = recording.seal();
     const bool isWhole = (*reader)->lossTotals().losses == 0 && !(*reader)->failure();
-    return seal && isWhole && seal->digest == digest.text() ? seal : std::nullopt;
+    const bool hasSentences = seal && (seal->positions.empty() || seal->positions == sentences.text());
+    return isWhole && hasSentences && seal->digest == digest.text() ? seal : std::nullopt;
 }
 
 std::optional<MaskSeal> sealOfSnapshot(ChunkedInput input) {

@@ -11,6 +11,7 @@
 #include "PropertyLists/PropertyList.h"
 #include "Recording/Files/GzipSource.h"
 #include "Recording/OpenMessages.h"
+#include "Recording/Positions/NMEASentence.h"
 #include "Tools/Decode/Decoding.h"
 #include "Tools/ExitStatus.h"
 #include "Tools/Mask/ReportText.h"
@@ -18,6 +19,7 @@
 #include "Tools/Report.h"
 
 #include <algorithm>
+#include <cstdint>
 #include <memory>
 #include <optional>
 #include <string>
@@ -112,6 +114,12 @@ Result<Done> searchFile(KnownValues& known, const std::string& path) {
     return Done{};
 }
 
+/// Whether the sentence is removed at that level: all are at the last one, and a maker's own at any.
+bool isMasked(const PositionSentence& text, const MaskOptions& masking) {
+    const auto sentence = NMEASentence::parse(text.text);
+    return masking.masksTimes() || (!masking.done && (!sentence || sentence->kind().empty()));
+}
+
 Result<MaskReport> identitiesLeft(const MaskCommandOptions& options, bool& isWhole) {
     Result<std::unique_ptr<ByteSource>> source = FileSource::open(options.file);
     const Result<MaskKey> key = MaskKey::random();
@@ -127,12 +135,16 @@ Result<MaskReport> identitiesLeft(const MaskCommandOptions& options, bool& isWho
     if (!reader)
         return Failure{options.file + ": " + reader.reason()};
     MessageMask mask(masking);
+    std::uint64_t sentences = 0;
+    (*reader)->setSentences(
+        [&](const PositionSentence& each) { sentences += isMasked(each, masking) ? 1 : 0; });
     (*reader)->setReadsAllTechnologies(true);
     while (const auto message = (*reader)->next()) {
         const std::string name = technologyOf(*message, **reader);
         static_cast<void>(mask.mask(*message, name.empty() ? options.technology : name));
     }
     MaskReport report = mask.report();
+    report.add(Masked::Position, sentences);
     for (const Comment& comment : (*reader)->comments().first())
         if (!MaskSeal::read(comment.text))
             report.add(Masked::Comment);

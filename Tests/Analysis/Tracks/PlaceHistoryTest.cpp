@@ -3,6 +3,8 @@
 
 #include "Analysis/Tracks/PlaceHistory.h"
 
+#include "Tests/Support/Fixes.h"
+
 #include <chrono>
 
 #include <gtest/gtest.h>
@@ -11,14 +13,6 @@ namespace velmora {
 namespace {
 
 using namespace std::chrono_literals;
-
-Fix fixAt(std::chrono::milliseconds time, double latitude) {
-    Fix fix;
-    fix.time = Time(time);
-    fix.latitude = latitude;
-    fix.longitude = 18;
-    return fix;
-}
 
 TEST(PlaceHistory, knowsWhereTheReceiverWas) {
     PlaceHistory history;

@@ -3,6 +3,8 @@
 
 #include "Analysis/Tracks/Track.h"
 
+#include "Tests/Support/Fixes.h"
+
 #include <chrono>
 #include <vector>
 
@@ -12,14 +14,6 @@ namespace velmora {
 namespace {
 
 using namespace std::chrono_literals;
-
-Fix fixAt(std::chrono::milliseconds time, double latitude, double longitude = 18) {
-    Fix fix;
-    fix.time = Time(time);
-    fix.latitude = latitude;
-    fix.longitude = longitude;
-    return fix;
-}
 
 Track trackOf(std::vector<Fix> fixes) {
     return Track::ofFixes(std::move(fixes));

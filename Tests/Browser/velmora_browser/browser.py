@@ -12,6 +12,8 @@ from typing import Any
 # Two frames: what was asked for in the first one is drawn in the second.
 DRAWN = "return new Promise((drawn) => requestAnimationFrame(() => requestAnimationFrame(() => drawn(true))))"
 LONGEST_WAIT_S = 20
+# Checking the whole page for accessibility takes a while on a busy machine.
+SCRIPT_TIMEOUT_MS = 240_000
 
 
 class Browser(ABC):

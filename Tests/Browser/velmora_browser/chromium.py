@@ -12,7 +12,7 @@ import urllib.request
 from pathlib import Path
 from typing import Any
 
-from .browser import Browser, key_actions, pinch_actions, pointer_actions
+from .browser import SCRIPT_TIMEOUT_MS, Browser, key_actions, pinch_actions, pointer_actions
 
 ELEMENT = "element-6066-11e4-a52e-4f735466cecf"
 
@@ -31,6 +31,7 @@ class Chromium(Browser):
                   "goog:loggingPrefs": {"browser": "ALL", "performance": "ALL"}}
         session = self._call("POST", "/session", {"capabilities": {"alwaysMatch": wanted}})
         self._url += "/session/" + session["sessionId"]
+        self._call("POST", "/timeouts", {"script": SCRIPT_TIMEOUT_MS})
         self._page = ""
         self._problems: list[str] = []
 
@@ -45,7 +46,7 @@ class Chromium(Browser):
         content = None if body is None else json.dumps(body).encode()
         request = urllib.request.Request(self._url + path, content, {"Content-Type": "application/json"}, method=method)
         try:
-            with urllib.request.urlopen(request, timeout=120) as answer:
+            with urllib.request.urlopen(request, timeout=SCRIPT_TIMEOUT_MS / 1000 + 20) as answer:
                 return json.load(answer)["value"]
         except urllib.error.HTTPError as error:
             raise RuntimeError(error.read().decode()[:2000]) from error

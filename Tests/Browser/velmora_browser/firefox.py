@@ -12,7 +12,7 @@ import time
 from pathlib import Path
 from typing import Any
 
-from .browser import Browser, key_actions, pointer_actions
+from .browser import SCRIPT_TIMEOUT_MS, Browser, key_actions, pointer_actions
 
 # It must not look for updates and the like: these would be requests of its own.
 PREFERENCES = {
@@ -58,6 +58,7 @@ class Firefox(Browser):
         self._number = 0
         self._page = ""
         self._call("WebDriver:NewSession", {"acceptInsecureCerts": False})
+        self._call("WebDriver:SetTimeouts", {"script": SCRIPT_TIMEOUT_MS})
 
     def _connect(self) -> socket.socket:
         port = Path(self._profile.name, "MarionetteActivePort")
@@ -65,7 +66,7 @@ class Firefox(Browser):
         while time.monotonic() < until:
             if port.exists() and port.read_text().strip():
                 try:
-                    return socket.create_connection(("127.0.0.1", int(port.read_text())), timeout=120)
+                    return socket.create_connection(("127.0.0.1", int(port.read_text())), timeout=SCRIPT_TIMEOUT_MS / 1000 + 20)
                 except OSError:
                     pass
             time.sleep(0.1)

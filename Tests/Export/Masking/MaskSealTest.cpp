@@ -12,7 +12,7 @@ namespace {
 
 MaskSeal exampleSeal() {
     MessageDigest digest;
-    return {MaskLevel::Location, exampleKey().fingerprint(), digest.text()};
+    return {MaskLevel::Location, exampleKey().fingerprint(), digest.text(), {}};
 }
 
 // SHA-256 of no message at all, as FIPS 180-4 has it.
@@ -31,6 +31,21 @@ TEST(MaskSealTest, MayLackTheDigest) {
     MaskSeal seal = exampleSeal();
     seal.digest.clear();
     EXPECT_EQ(MaskSeal::read(seal.text()), seal);
+}
+
+TEST(MaskSealTest, HasADigestOfPositions) {
+    MaskSeal seal = exampleSeal();
+    MessageDigest sentences;
+    seal.positions = sentences.text();
+    EXPECT_EQ(seal.text(), "velmora-mask 1 level=location key=0a236b28bb6d5db1805b6821a52e2cf7 messages=" +
+                               std::string(nothing) + " positions=" + std::string(nothing));
+    EXPECT_EQ(MaskSeal::read(seal.text()), seal);
+    EXPECT_FALSE(MaskSeal::read(seal.text() + "0"));
+    EXPECT_FALSE(MaskSeal::read(std::string_view(seal.text()).substr(0, 200)));
+    seal.digest.clear();
+    EXPECT_FALSE(MaskSeal::read(seal.text())) << "positions without messages";
+    sentences.addSentence("$GPGGA");
+    EXPECT_NE(sentences.text(), nothing);
 }
 
 TEST(MaskSealTest, OtherTextsAreNone) {

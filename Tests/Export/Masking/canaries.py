@@ -9,16 +9,18 @@ Shares nothing with the masked program: it reads and writes the blocks of a reco
 itself. Planted are the identities that SIM files, contexts, displays and a live modem's messages have, under the keys
 of these and under unknown keys; in records of unknown codes, behind the end of known ones and in bytes that no
 field is read from; in malformed messages; and in comments, options, host names and unknown blocks of the recording.
-Each is searched for in eight encodings. Exit status: 0 nothing found, 1 something found or a command failed, 2 usage.
+Each is searched for in eight encodings and as a number. Exit status: 0 nothing found, 1 something found or a command failed, 2 usage.
 """
 
 from __future__ import annotations
 
 import argparse
 import base64
+import binascii
 import gzip
 import plistlib
 import random
+import re
 import struct
 import subprocess
 import sys
@@ -78,7 +80,7 @@ def packed(digits: str, swapped: bool) -> bytes:
 def encodings(value: str) -> dict[str, list[bytes]]:
     """The byte strings of which at least one is in what holds the value in that encoding."""
     text = value.encode()
-    found = {
+    found: dict[str, list[bytes]] = {
         "ASCII": [text],
         "UTF-16LE": [value.encode("utf-16-le")],
         "UTF-16BE": [value.encode("utf-16-be")],
@@ -90,33 +92,35 @@ def encodings(value: str) -> dict[str, list[bytes]]:
         found["base64"].append(encoded[-(-before * 8 // 6) : (before + len(text)) * 8 // 6])
     if value.isdigit():
         # From the first digit on, or from the second, where the first shares its byte with what is before.
+        if int(value) < 1 << 63 and value[0] != "0":
+            found["number"] = [int(value).to_bytes(8, "big")]
         for name, swapped in (("BCD", False), ("swapped BCD", True)):
             found[name] = [packed(part[: len(part) // 2 * 2], swapped) for part in (value, value[1:])]
     return found
 
 
+# Where gzip or zlib may have begun: a second byte that makes the header a multiple of 31 (RFC 1950).
+COMPRESSED = re.compile(rb"\x1f\x8b|\x78[\x01\x20\x3f\x5e\x7d\x9c\xbb\xda\xf9]")
+# The one encoding that XML property lists have of their own, with blanks in it.
+XML_DATA = re.compile(rb"<data>([^<]*)</data>")
+
+
 def unpacked(content: bytes) -> list[bytes]:
-    """The content, and all that gzip or zlib have compressed in it."""
+    """The content, all that gzip or zlib have compressed in it, and the data of its property lists in XML. Those in binary
+    have their texts and data as they are, and numbers as `encodings` has them."""
     parts = [content]
-    for at in range(len(content) - 2):
-        start = content[at : at + 2]
-        if start == b"\x1f\x8b" or (start[0] == 0x78 and int.from_bytes(start, "big") % 31 == 0):
-            try:
-                parts.append(zlib.decompressobj(47).decompress(content[at:], 1 << 24))
-            except zlib.error:
-                continue
+    view = memoryview(content)
+    for found in COMPRESSED.finditer(content):
+        try:
+            parts.append(zlib.decompressobj(47).decompress(view[found.start() :], 1 << 24))
+        except zlib.error:
+            continue
+    for found in XML_DATA.finditer(content):
+        try:
+            parts += unpacked(binascii.a2b_base64(found[1]))
+        except binascii.Error:
+            continue
     return parts
-
-
-def strings_of(value: Any) -> list[bytes]:
-    """All texts and data of a property list, which XML writes in encodings of its own."""
-    if isinstance(value, dict):
-        return [part for key, each in value.items() for part in strings_of(key) + strings_of(each)]
-    if isinstance(value, list):
-        return [part for each in value for part in strings_of(each)]
-    if isinstance(value, bytes):
-        return unpacked(value)
-    return [str(value).encode()]
 
 
 def block(kind: int, body: bytes) -> bytes:
@@ -288,20 +292,18 @@ def run(*arguments: str | Path, status: int = 0) -> str:
     return done.stdout + done.stderr
 
 
-def search(name: str, content: bytes, values: list[str]) -> list[str]:
-    parts = unpacked(content)
-    try:
-        parts += strings_of(plistlib.loads(content))
-    except Exception:  # no snapshot
-        pass
-    for _, message in packets_of(content) if content.startswith(b"\x0a\x0d\x0d\x0a") else []:
-        for start in (0, HEADER):
-            try:
-                parts += strings_of(plistlib.loads(message[start:]))
-            except Exception:  # no property list
-                continue
-    return [f"{name}: {value} found: {encoding}" for value in values for encoding, forms in encodings(value).items()
-            if any(form in part for form in forms for part in parts)]
+class Search:
+    """Looks for the values of one drive."""
+
+    def __init__(self, values: list[str]) -> None:
+        self.values = values
+        self.forms = [(value, encoding, form) for value in values for encoding, forms in encodings(value).items()
+                      for form in forms]
+
+    def __call__(self, name: str, content: bytes) -> list[str]:
+        # Between two parts is more than any value has, and nothing that it could have.
+        joined = (b"\xaa" * 64).join(unpacked(content))
+        return [f"{name}: {value} found: {encoding}" for value, encoding, form in self.forms if form in joined]
 
 
 def check(log: Path, drive: Path, scenario: str, seed: int, folder: Path) -> list[str]:
@@ -314,7 +316,8 @@ def check(log: Path, drive: Path, scenario: str, seed: int, folder: Path) -> lis
     known.write_text("".join(value + "\n" for value in values))
     problems = []
     # The search has to find what was planted, or it would find nothing anywhere.
-    before = "\n".join(search("planted", planted.read_bytes(), values))
+    search = Search(values)
+    before = "\n".join(search("planted", planted.read_bytes()))
     problems += [f"{value} was not planted" for value in (planter.imsi, planter.iccid) if value not in before]
     if "found" not in run(log, "mask", "--check", planted, "--known", known, status=1):
         problems.append("--known finds nothing of what was planted")
@@ -324,7 +327,7 @@ def check(log: Path, drive: Path, scenario: str, seed: int, folder: Path) -> lis
             masked = folder / f"masked.{form}"
             run(log, "--log-level", "0", "mask", "--force", "--level", level, planted, masked)
             name = f"{scenario} {seed}, {level}, {form}"
-            problems += search(name, masked.read_bytes(), values)
+            problems += search(name, masked.read_bytes())
             output = run(log, "mask", "--check", "--level", level, "--technology", TECHNOLOGIES[scenario], masked,
                          "--known", known)
             if any(value in output for value in values):

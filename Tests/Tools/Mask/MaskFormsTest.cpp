@@ -3,6 +3,8 @@
 
 #include "LogMessages/LogMessage.h"
 #include "LogMessages/RecordTime.h"
+#include "Recording/Pcapng/PcapngWriter.h"
+#include "Tests/Support/NMEA.h"
 #include "Tests/Tools/Mask/MaskFixture.h"
 
 #include <gmock/gmock.h>
@@ -26,6 +28,7 @@ protected:
                 static_cast<std::uint8_t>(recordTimestamp(time) >> (8 * i));
         return Data(std::move(bytes));
     }
+    void writePositions(const std::string& name, const std::vector<std::string>& sentences);
     void convert(const std::string& in, const std::string& out) {
         ToolProcess process(tool({"convert", path(in), path(out)}));
         EXPECT_EQ(process.exitStatus(), 0) << process.errors();
@@ -82,6 +85,80 @@ TEST_F(MaskFormsTest, LogHasNoRecordThatItsReaderWouldNotFind) {
     EXPECT_THAT(outcome.output + outcome.messages, HasSubstr("5 messages, 2 changed, 1 left out"));
     EXPECT_EQ(messagesOf("out/a.dlf").size(), 4U);
     static_cast<void>(mask({"--check", "--technology", "GSM", path("out/a.dlf")}));
+}
+
+/// Writes the drive with these sentences after the first message.
+void MaskFormsTest::writePositions(const std::string& name, const std::vector<std::string>& sentences) {
+    const auto writer = PcapngWriter::create(path(name), "Ostrel_GSM", PcapngWriter::Positions::With);
+    ASSERT_TRUE(writer) << writer.reason();
+    for (const TimedMessage& each : _drive) {
+        ASSERT_TRUE((*writer)->append(each.time, each.message.bytes()));
+        if (each.time != _drive.front().time)
+            continue;
+        for (const std::string& sentence : sentences)
+            ASSERT_TRUE((*writer)->appendSentence(each.time, nmea0183(sentence)));
+    }
+    ASSERT_TRUE((*writer)->close());
+}
+
+TEST_F(MaskFormsTest, SealCoversPositions) {
+    const std::string sentence = "GPGLL,5920.0000,N,01803.0000,E,050000,A,A";
+    writePositions("placed.pcapng", {sentence});
+    static_cast<void>(mask({"--key", path("key"), path("placed.pcapng"), path("out/a.pcapng")}));
+    static_cast<void>(mask({"--check", path("out/a.pcapng")}));
+    static_cast<void>(mask({"--key", path("key"), path("out/a.pcapng"), path("out/b.pcapng")}));
+    EXPECT_EQ(contentOf("out/a.pcapng"), contentOf("out/b.pcapng"));
+    std::string content = contentOf("out/a.pcapng");
+    const std::size_t place = content.find("5920.0000");
+    ASSERT_NE(place, std::string::npos);
+    content.replace(place, 9, "5921.0000");
+    std::ofstream(path("changed.pcapng"), std::ios::binary) << content;
+    EXPECT_THAT(mask({"--check", path("changed.pcapng")}, 1).output, HasSubstr("in clear: subscriber 1"));
+}
+
+TEST_F(MaskFormsTest, PositionAddedLaterIsNoticed) {
+    static_cast<void>(mask({"--key", path("key"), path("drive.pcapng"), path("out/a.pcapng")}));
+    std::ofstream(path("track.nmea")) << nmea0183("GPRMC,050001,A,5920.0000,N,01803.0000,E,,,161126,,");
+    ToolProcess process(
+        tool({"convert", "--track", path("track.nmea"), path("out/a.pcapng"), path("added.pcapng")}));
+    ASSERT_EQ(process.exitStatus(), 0) << process.errors();
+    EXPECT_THAT(mask({"--check", path("added.pcapng")}, 1).output, HasSubstr("in clear: subscriber 1"));
+}
+
+TEST_F(MaskFormsTest, SealOfAnEarlierVersionIsRead) {
+    static_cast<void>(mask({path("drive.pcapng"), path("out/a.pcapng")}));
+    // A comment of a block of statistics, without the digest of positions and with its lengths.
+    std::string content = contentOf("out/a.pcapng");
+    constexpr std::string_view mark = " positions=";
+    const std::size_t digest = content.find(mark);
+    ASSERT_NE(digest, std::string::npos);
+    const std::size_t begin = content.rfind("velmora-mask 1", digest);
+    const auto length = static_cast<std::uint16_t>(digest - begin);
+    std::string old = content.substr(begin, length);
+    old.resize((old.size() + 3) / 4 * 4);
+    constexpr std::size_t before = 20 + 4; // the block's fields, the option's code and length
+    std::string block = content.substr(begin - before, before) + old + std::string(8, '\0');
+    const auto put = [&block](std::size_t offset, std::size_t value, std::size_t width) {
+        for (std::size_t i = 0; i < width; ++i)
+            block[offset + i] = static_cast<char>(value >> (8 * i));
+    };
+    put(22, length, 2);
+    put(4, block.size(), 4);
+    put(block.size() - 4, block.size(), 4);
+    std::ofstream(path("old.pcapng"), std::ios::binary) << content.substr(0, begin - before) << block;
+    static_cast<void>(mask({"--check", path("old.pcapng")}));
+}
+
+TEST_F(MaskFormsTest, PositionsThatALevelRemovesAreInClear) {
+    // The second one is a maker's own.
+    writePositions("placed.pcapng", {"GPGLL,5920.0000,N,01803.0000,E,050000,A,A", "PXYZ,12345"});
+    EXPECT_THAT(mask({"--check", path("placed.pcapng")}, 1).output, HasSubstr("in clear: position 1\n"));
+    static_cast<void>(mask({path("placed.pcapng"), path("out/a.pcapng")}));
+    static_cast<void>(mask({"--check", path("out/a.pcapng")}));
+    EXPECT_THAT(mask({"--check", "--level", "all", path("out/a.pcapng")}, 1).output,
+                HasSubstr("in clear: position 1\n"));
+    static_cast<void>(mask({"--level", "all", path("placed.pcapng"), path("out/b.pcapng")}));
+    static_cast<void>(mask({"--check", "--level", "all", path("out/b.pcapng")}));
 }
 
 TEST_F(MaskFormsTest, GzippedFilesAreRead) {
