@@ -16,6 +16,7 @@
 #include "Recording/Pcapng/RecordingCopy.h"
 #include "Recording/Refreshes/RefreshTicks.h"
 #include "Tools/Convert/AddedPositions.h"
+#include "Tools/Convert/DatabaseConversion.h"
 #include "Tools/Convert/TrackConversion.h"
 #include "Tools/Decode/Decoding.h"
 #include "Tools/Messages/TechnologyChoice.h"
@@ -243,11 +244,15 @@ std::optional<FileForm> formFromName(std::string_view name) {
         return FileForm::GeoJSON;
     if (name.ends_with(".kml"))
         return FileForm::KML;
+    if (name.ends_with(".sqlite"))
+        return FileForm::Database;
     return std::nullopt;
 }
 
 Result<bool> convertMessages(MessageReader& reader, const Conversion& conversion, int descriptor,
                              WorkContext& context) {
+    if (conversion.form == FileForm::Database)
+        return convertToDatabase(reader, conversion, context);
     if (isTrack(conversion.form))
         return convertToTrack(reader, conversion, descriptor, context);
     if (conversion.form == FileForm::Recording)
