@@ -7,7 +7,7 @@
 
 # shellcheck disable=SC2034 # the scripts that source this file use them
 build_packages=(build-essential cmake ninja-build qt6-base-dev libgl-dev libpugixml-dev libcli11-dev
-    libboost-dev libgps-dev libthrift-dev libtomlplusplus-dev libutf8proc-dev libxxhash-dev libzstd-dev nettle-dev zlib1g-dev)
+    libboost-dev libgps-dev libsqlite3-dev libthrift-dev libtomlplusplus-dev libutf8proc-dev libxxhash-dev libzstd-dev nettle-dev zlib1g-dev)
 # shellcheck disable=SC2034
 test_packages=(libgtest-dev libgmock-dev librapidcheck-dev libbenchmark-dev nlohmann-json3-dev python3 tshark gpsd gpsd-clients
     gdal-bin libxml2-utils clang-format-14

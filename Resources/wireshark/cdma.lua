@@ -79,7 +79,7 @@ end
 
 -- The data rate since the earlier record, by its sequence number and the bits that were sent until now.
 local function addRate(tree, view, record, what, at, sequence, sent)
-    local rate = once(record, what, function(state)
+    local rate = once(record, function(state)
         local earlier = state[what]
         state[what] = {sequence, sent}
         if earlier then
@@ -204,7 +204,7 @@ shapes["119D"] = function(tree, view, record)
         return
     end
     local erased = byte(record.bytes, at + 25) ~= 0
-    local average = once(record, "errors", function(state)
+    local average = once(record, function(state)
         local new = erased and 0.015625 or 0
         if state.errors then
             new = single(new + single(state.errors * 0.984375))
@@ -260,7 +260,7 @@ shapes["119C"] = function(tree, view, record)
     addValid(tree, view.groups, record, system, isTraffic, 1)
     addValid(tree, view.groups, record, radio, isTraffic, 2)
     addAll()
-    local last = once(record, "closed", function(state)
+    local last = once(record, function(state)
         local errors = state.errors
         if not isTraffic then
             state.errors = nil

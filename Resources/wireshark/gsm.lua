@@ -24,7 +24,7 @@ shapes["Neighboring Cells 51FF"] = function(_, _, record)
     local count = byte(record.bytes, 15)
     local complete = completeCount(record, 15, 4, 4, count)
     missingEntries(record, complete, count)
-    once(record, "bsics", function(state)
+    once(record, function(state)
         state.bsics = {}
         for i = 0, complete - 1 do
             local low, high, bsic = byte(record.bytes, 16 + 4 * i, 18 + 4 * i)
@@ -35,7 +35,7 @@ shapes["Neighboring Cells 51FF"] = function(_, _, record)
 end
 shapes["Neighboring Cells 5137"] = function(tree, view, record)
     local list = view.lists[""]
-    local bsics = once(record, "cells", function(state) return state.bsics or false end)
+    local bsics = once(record, function(state) return state.bsics or false end)
     addRows(tree, list, record, 29, 14, byte(record.bytes, 29), function(row, base, range)
         addGroup(row, list.groups[1], record, base)
         local bsic = bsics and bsics[littleEndian(record.bytes, base + 1, 2)]

@@ -22,15 +22,20 @@ end
 local running = {}
 local kept = {}
 
--- What `compute` returns of the technology's state, when this packet is looked at for the first time.
-local function once(record, what, compute)
-    local key = record.number .. what
-    if kept[key] == nil then
-        local state = running[record.technology] or {}
-        running[record.technology] = state
-        kept[key] = {compute(state)}
+-- What `compute` returns of the technology's state, when this packet is looked at for the first time. A packet is
+-- of one code, which has one such value; it may not be nil.
+local function once(record, compute)
+    local value = kept[record.number]
+    if value == nil then
+        local state = running[record.technology]
+        if not state then
+            state = {}
+            running[record.technology] = state
+        end
+        value = compute(state)
+        kept[record.number] = value
     end
-    return kept[key][1]
+    return value
 end
 
 local function damaged(record, expert, text)

@@ -99,7 +99,7 @@ TEST(CommandLineErrorsTest, UsageErrorsGiveTheFoundAndTheExpectedValue) {
         {{"watch", "--timeout", "1"}, "--timeout requires --once"},
         {{"convert", "a"}, "OUT is required"},
         {{"convert", "a", "-"},
-         "OUT: got -, wanted a name that ends in .pcapng, .velmora, .dlf, .gpx, .geojson or .kml"},
+         "OUT: got -, wanted a name that ends in .pcapng, .velmora, .dlf, .gpx, .geojson, .kml or .sqlite"},
         {{"decode", "--technology", "5G", "a"}, "--technology: got 5G, wanted one of " + technologies},
         {{"convert", "--technology", "Ostrel_XYZ", "a", "b.dlf"},
          "--technology: got Ostrel_XYZ, wanted one of " + technologies},

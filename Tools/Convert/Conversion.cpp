@@ -14,6 +14,7 @@
 #include "Recording/Pcapng/PcapngWriter.h"
 #include "Recording/Refreshes/RefreshTicks.h"
 #include "Tools/Convert/AddedPositions.h"
+#include "Tools/Convert/DatabaseConversion.h"
 #include "Tools/Convert/RecordingConversion.h"
 #include "Tools/Convert/SelectedMessages.h"
 #include "Tools/Convert/TrackConversion.h"
@@ -175,11 +176,15 @@ std::optional<FileForm> formFromName(std::string_view name) {
         return FileForm::GeoJSON;
     if (name.ends_with(".kml"))
         return FileForm::KML;
+    if (name.ends_with(".sqlite"))
+        return FileForm::Database;
     return std::nullopt;
 }
 
 Result<bool> convertMessages(MessageReader& reader, const Conversion& conversion, int descriptor,
                              WorkContext& context) {
+    if (conversion.form == FileForm::Database)
+        return convertToDatabase(reader, conversion, context);
     if (isTrack(conversion.form))
         return convertToTrack(reader, conversion, descriptor, context);
     if (conversion.form == FileForm::Recording)

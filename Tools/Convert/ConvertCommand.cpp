@@ -41,10 +41,10 @@ std::optional<std::uint64_t> refreshesOf(const std::string& file, const Conversi
     return countRefreshes(**reader, conversion.messages, choice->only);
 }
 
-/// What a track shows: what was chosen, or how good reception was.
+/// What a track shows: what was chosen, or how good reception was. A database has everything by default.
 LeafChoice attributesOf(const ConvertOptions& options) {
     LeafChoice choice = leafChoice(options.selection, options.roles);
-    if (choice.isEverything()) {
+    if (choice.isEverything() && isTrack(*formFromName(options.out))) {
         choice.addRole(Role::ServingLevel);
         choice.addRole(Role::ServingQuality);
     }
@@ -70,6 +70,7 @@ Conversion conversionOf(const ConvertOptions& options, std::vector<Fix> position
     conversion.title = fileTitle(options.file);
     conversion.path = options.file;
     conversion.name = options.out;
+    conversion.temporary = output->path();
     conversion.technology = options.technology;
     if (!options.technology.empty())
         conversion.technologies = technologiesOf(options.file);

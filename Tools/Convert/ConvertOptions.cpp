@@ -20,8 +20,10 @@ void checkTogether(const ConvertOptions& options) {
     const FileForm form = *formFromName(options.out);
     if (!options.track.empty() && form != FileForm::Recording)
         throw CLI::ValidationError("--track", "got another output, wanted a .pcapng");
-    if ((!options.selection.paths().empty() || !options.roles.isEverything()) && !isTrack(form))
-        throw CLI::ValidationError("--select", "got another output, wanted a .gpx, .geojson or .kml");
+    if ((!options.selection.paths().empty() || !options.roles.isEverything()) && !isTrack(form) &&
+        form != FileForm::Database)
+        throw CLI::ValidationError("--select",
+                                   "got another output, wanted a .gpx, .geojson, .kml or .sqlite");
     if (isTrack(form) && !options.messages.codes.empty())
         throw CLI::ValidationError("--code", "got a track as output, wanted a .pcapng, .velmora or .dlf");
 }
@@ -37,7 +39,8 @@ CLI::App* addConvert(CLI::App& app, ConvertOptions& options) {
     command
         ->add_option("OUT", options.out,
                      "The output; its suffix selects the form: .pcapng a recording, .velmora a snapshot, "
-                     ".dlf a DLF log; .gpx, .geojson or .kml the track with values and events")
+                     ".dlf a DLF log; .gpx, .geojson or .kml the track with values and events; .sqlite a "
+                     "database")
         ->required()
         ->check(validator([](const std::string& name) { return formFromName(name).has_value(); },
                           std::string("a name that ends in ") + formSuffixes))
@@ -55,9 +58,9 @@ CLI::App* addConvert(CLI::App& app, ConvertOptions& options) {
     addChoice(*command, options.selection, options.roles);
     for (const char* const name : {"--select", "--role"})
         command->get_option(name)->description(
-            "For a track: " +
+            "For a track or database: " +
             std::string(name == std::string_view("--select") ? "the part of the display" : "the role") +
-            " whose values its points have; by default serving.level and serving.quality" +
+            " whose values it has; by default serving.level and serving.quality, a database all" +
             (name == std::string_view("--select") ? "; may be repeated" : ""));
     addMaximumGap(*command, options.maximumGap);
     command->add_option("--description", options.description, "A snapshot's description; empty by default")
@@ -70,6 +73,8 @@ CLI::App* addConvert(CLI::App& app, ConvertOptions& options) {
         "that the application would have written after the last message: the last five displays with the\n"
         "messages before each. A track file has a point for each fix, with speed and the values that were\n"
         "reported up to 10 s before, and a point for each event; KML colours the line by the first value.\n"
+        "A database has tables of messages, samples, events, positions and the catalogue, and views of "
+        "them.\n"
         "OUT is complete or does not exist. Losses in FILE are reported and give\n"
         "exit status 1; the rest is converted.\n\n" +
         std::string(timeHelp) +
@@ -79,6 +84,7 @@ CLI::App* addConvert(CLI::App& app, ConvertOptions& options) {
         "  velmora-log convert --technology Ostrel_LTE modem.dlf modem.pcapng\n"
         "  velmora-log convert --track drive.gpx drive.pcapng positioned.pcapng\n"
         "  velmora-log convert --role serving.level positioned.pcapng drive.geojson\n"
+        "  velmora-log convert drive.pcapng drive.sqlite\n"
         "  velmora-log record - | velmora-log convert - drive.dlf");
     command->callback([&options] { checkTogether(options); });
     return command;

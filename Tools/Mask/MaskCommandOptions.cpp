@@ -22,7 +22,7 @@ CLI::App* addMask(CLI::App& app, MaskCommandOptions& options) {
                            ->check(validator(
                                [](const std::string& name) {
                                    const auto form = formFromName(name);
-                                   return form && !isTrack(*form);
+                                   return form && holdsMessages(*form);
                                },
                                std::string("a name that ends in ") + messageSuffixes))
                            ->type_name("");

@@ -116,10 +116,11 @@ TEST_F(ConvertCommandTest, NewFileIsItsUsersAlone) {
 
 TEST_F(ConvertCommandTest, OutputWithoutAFormIsAUsageError) {
     for (const std::string out : {"-", "drive", "drive.txt", "drive.PCAPNG", "velmora"})
-        EXPECT_EQ(convert({path("drive.pcapng"), out}, 2),
-                  "velmora-log: OUT: got " + out +
-                      ", wanted a name that ends in .pcapng, .velmora, .dlf, .gpx, .geojson or .kml\n"
-                      "velmora-log --help tells more\n");
+        EXPECT_EQ(
+            convert({path("drive.pcapng"), out}, 2),
+            "velmora-log: OUT: got " + out +
+                ", wanted a name that ends in .pcapng, .velmora, .dlf, .gpx, .geojson, .kml or .sqlite\n"
+                "velmora-log --help tells more\n");
 }
 
 TEST_F(ConvertCommandTest, FileThatIsThereIsKeptUnlessForced) {
