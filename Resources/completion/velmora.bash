@@ -240,11 +240,12 @@ _velmora_log() {
         if [[ $cur == -* ]]; then
             _velmora_offer "${options[@]}" --version
         else
-            _velmora_offer decode watch record convert info fields events rules stats diff report mask columns
+            _velmora_offer decode browse watch record convert info fields events rules stats diff report mask columns
         fi
         return
         ;;
     decode) options+=(--format --every --samples --wide --positions --max-gap --safe --max-age --select --from --to --code --warm --technology --mask --key --strict --jobs) ;;
+    browse) options+=(--line --technology) ;;
     watch) options+=(--once --timeout --bell --mask --key) ;;
     record) options+=(--force --duration --count --timeout --gps) ;;
     convert) options+=(--force --from --to --code --technology --description --strict --track --select --role --max-gap) ;;
@@ -266,7 +267,7 @@ _velmora_log() {
     case $command:$files in
     rules:0) _velmora_offer check test ;;
     rules:*) _filedir toml ;;
-    decode:* | info:* | events:* | stats:* | report:* | columns:* | record:0 | convert:[01] | diff:[01] | mask:[01])
+    decode:* | browse:* | info:* | events:* | stats:* | report:* | columns:* | record:0 | convert:[01] | diff:[01] | mask:[01])
         _filedir '@(pcapng|velmora|dlf)'
         ;;
     esac

@@ -25,11 +25,12 @@ TEST(CommandLineErrorsTest, UsageErrorsGiveTheFoundAndTheExpectedValue) {
     };
     const Case cases[] = {
         {{},
-         "no command, wanted decode, watch, record, convert, info, fields, events, rules, stats, diff, "
-         "report, mask or columns"},
+         "no command, wanted decode, browse, watch, record, convert, info, fields, events, rules, stats, "
+         "diff, report, mask or columns"},
         {{"bogus"},
-         "got bogus, wanted one of the commands decode, watch, record, convert, info, fields, events, rules, "
-         "stats, diff, report, mask and columns"},
+         "got bogus, wanted one of the commands decode, browse, watch, record, convert, info, fields, "
+         "events, "
+         "rules, stats, diff, report, mask and columns"},
         {{"decode"}, "FILE is required"},
         {{"mask"}, "FILE is required"},
         {{"mask", "a.pcapng"}, "OUT is required"},

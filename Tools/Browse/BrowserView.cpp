@@ -43,7 +43,7 @@ const ReportedField* Browser::chosenField(const InspectedMessage& message) const
         const bool isAtByte = field.place && field.place->has(_byte);
         // Where several fields share a byte, the row of the display that was chosen before counts.
         if (_part == BrowsePart::Content ? isAtByte && (!found || field.path == _displayPath)
-                                       : field.path == message.rows[displayRow(message)].path)
+                                         : field.path == message.rows[displayRow(message)].path)
             found = &field;
     }
     return found;

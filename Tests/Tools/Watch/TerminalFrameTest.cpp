@@ -76,7 +76,7 @@ TEST(TerminalFrameTest, KeysScrollWithinTheRows) {
     const Case cases[] = {
         {Key::Up, 0, 0},     {Key::Up, 4, 3},     {Key::Down, 4, 5},     {Key::Down, 7, 7},
         {Key::PageUp, 2, 0}, {Key::PageUp, 5, 2}, {Key::PageDown, 1, 4}, {Key::PageDown, 5, 7},
-        {Key::Home, 5, 0},   {Key::End, 1, 7},    {Key::Escape, 3, 3},     {Key::Up, 99, 6},
+        {Key::Home, 5, 0},   {Key::End, 1, 7},    {Key::Escape, 3, 3},   {Key::Up, 99, 6},
     };
     for (const Case& row : cases)
         EXPECT_EQ(scrolledBy(row.key, row.from, layout), row.to);

@@ -55,8 +55,8 @@ std::vector<StyledLine> listLines(const BrowseView& view, std::size_t rows) {
     for (std::size_t i = 0; i < view.rows.size() && i < rows; ++i) {
         const bool isChosen = i == view.chosenRow;
         const Style style = isChosen && view.part == BrowsePart::Messages ? Style::Chosen
-                            : isChosen                                ? Style::Heading
-                                                                      : Style::Plain;
+                            : isChosen                                    ? Style::Heading
+                                                                          : Style::Plain;
         lines.push_back({{(isChosen ? ">" : " ") + rowText(view.rows[i]), style}});
     }
     lines.resize(rows);
