@@ -148,7 +148,7 @@ TEST(RadioConditionsTest, anOldLevelOfTheServingCellIsNotCompared) {
     KeptTruth truth;
     RadioConditions conditions(truth);
     conditions.compareServing(0s, -90);
-    for (TruthTime at = 0s; at <= 20s; at += 1s) {
+    for (TruthTime at{0}; at <= 20s; at += 1s) {
         conditions.compareNeighbours(at, {-90, -90, -90}, true);
         conditions.confirm(at);
     }
