@@ -59,6 +59,8 @@ protected:
     /// The phases must outlive the scenario and be those of its own kind.
     DriveScenario(std::uint64_t seed, std::span<const Phase> phases) : _phases(phases), _random(seed) {}
 
+    /// Replaces the phases; to be called before the first message.
+    void setRound(std::span<const Phase> phases) { _phases = phases; }
     /// Moves the car: the network's levels change, and with them the phone's measurements.
     virtual void drive(double seconds) = 0;
     /// Where the car is.

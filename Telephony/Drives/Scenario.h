@@ -37,6 +37,10 @@ public:
     /// the first message.
     virtual void setIdentities(const DriveIdentities& identities) = 0;
 
+    /// The drive becomes a short round of what its other drives never have, such as a call that is lost. To
+    /// be called before the first message. The default is for a technology without such a round.
+    virtual void addIncidents() {}
+
     /// What the drive's phone does is passed on from now on, which changes no message. To be called before
     /// the first message; the sink must outlive the scenario.
     virtual void tellTruth(TruthSink& sink) = 0;

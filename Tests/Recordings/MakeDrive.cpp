@@ -27,6 +27,7 @@
 // same file; a FILE of - is standard output, so that a long drive need not be stored. With --truth it also
 // writes what the drive's phone did, as JSON lines; the recording is the same with and without it.
 // With --positions it has a receiver's sentences of the drive's own road as well, a fix a second.
+// With --incidents the drive is a short round of what the scenario's other drives never have.
 // With --identities the numbers and addresses are random ones of the seed, which it lists, one a line.
 
 namespace velmora {
@@ -157,6 +158,7 @@ bool plantIdentities(Scenario& scenario, std::uint64_t seed, const std::string& 
 int run(std::vector<std::string> arguments) {
     const std::optional<std::string> truth = takeOption(arguments, "--truth");
     const bool hasPositions = std::erase(arguments, "--positions") > 0;
+    const bool hasIncidents = std::erase(arguments, "--incidents") > 0;
     const std::optional<std::string> identities = takeOption(arguments, "--identities");
     const bool isComplete = arguments.size() == 4;
     const ScenarioKind* kind = isComplete ? scenarioKindNamed(arguments[0]) : nullptr;
@@ -166,12 +168,14 @@ int run(std::vector<std::string> arguments) {
         std::fprintf(
             stderr,
             "usage: make-drive SCENARIO SEED MESSAGES|HOURSh|SECONDSs FILE [--truth FILE] [--positions] "
-            "[--identities FILE]\n"
+            "[--incidents] [--identities FILE]\n"
             "scenarios: %s\n",
             scenarioNames().c_str());
         return 2;
     }
     const std::unique_ptr<Scenario> scenario = kind->make(*seed);
+    if (hasIncidents)
+        scenario->addIncidents();
     if (identities && !plantIdentities(*scenario, *seed, *identities)) {
         std::fprintf(stderr, "make-drive: cannot write %s\n", identities->c_str());
         return 1;

@@ -110,7 +110,7 @@ void C2KReportContext::transferUntil(double at) {
         connected ? std::min(1.2288e6 * 0.5 * std::log2(1 + ci), 2.4576e6) * (0.6 + 0.3 * random.unit())
                   : 2048;
     const double reverse_bps = connected ? 38400 + 115200 * random.unit() : 0;
-    forwardRest_bits += forward_bps * seconds;
+    forwardRest_bits += isStalled ? 0 : forward_bps * seconds;
     reverseRest_bits += reverse_bps * seconds;
     const auto take = [](double& rest_bits, int size, double share) {
         const auto packets = static_cast<std::int64_t>(rest_bits * share / size);

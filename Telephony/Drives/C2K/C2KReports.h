@@ -40,6 +40,7 @@ struct C2KReportContext {
     /// The 1x state as its latest report has it: the receiver sleeps between two pages.
     records::OneXState receiver = records::OneXState::Inactive;
     bool isFrameErased = false; ///< the latest frame of a call
+    bool isStalled = false;     ///< no packet arrives, whatever is sent
 
     /// The serving pilot and those of its carrier that are close enough to be in the active set.
     [[nodiscard]] std::vector<C2KPilot> activeSet(std::size_t limit) const;

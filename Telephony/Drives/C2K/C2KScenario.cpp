@@ -30,8 +30,19 @@ const DriveScenario::Phase C2KScenario::phases[] = {
     {6, &C2KScenario::powerOff},    // until the next round
 };
 
+const DriveScenario::Phase C2KScenario::incidents[] = {
+    {20, &C2KScenario::powerOn},    {12, &C2KScenario::connect}, {15, &C2KScenario::stall},
+    {15, &C2KScenario::flow},       {6, &C2KScenario::stall}, // too short for an event
+    {10, &C2KScenario::flow},       {25, &C2KScenario::stall},   {10, &C2KScenario::flow},
+    {10, &C2KScenario::disconnect}, {6, &C2KScenario::powerOff},
+};
+
 C2KScenario::C2KScenario(std::uint64_t seed)
     : DriveScenario(seed ^ 0xC2C2, phases), _network(seed), _context{_phone, _network, random()} {}
+
+void C2KScenario::addIncidents() {
+    setRound(incidents);
+}
 
 std::string_view C2KScenario::technology() const {
     return kVoxLogChannelTechnology_Ostrel_CDMA;

@@ -35,6 +35,8 @@ public:
     [[nodiscard]] std::string_view technology() const override;
     /// The records have none of them: the UATI is the network's, and random anyway.
     void setIdentities(const DriveIdentities& /*identities*/) override {}
+    /// An EV-DO connection on which nothing arrives for a while, twice, in a round of some two minutes.
+    void addIncidents() override;
 
     /// What the messages are of: the phone and the cells around it after the last step.
     [[nodiscard]] const C2KPhone& phone() const { return _phone; }
@@ -42,6 +44,7 @@ public:
 
 private:
     static const Phase phases[];
+    static const Phase incidents[];
 
     /// The phone's procedures; each adds its steps to the script, from now on.
     void powerOn();
@@ -50,6 +53,8 @@ private:
     void startCall();
     void endCall();
     void powerOff();
+    void stall() { _context.isStalled = true; }
+    void flow() { _context.isStalled = false; }
 
     void drive(double seconds) override;
     [[nodiscard]] const RadioNetwork& road() const override { return _network.radio(); }

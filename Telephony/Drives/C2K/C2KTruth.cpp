@@ -12,7 +12,14 @@ namespace {
 using namespace records;
 
 /// The codes of C2KRecords.h whose records state the phone.
-enum Code : std::uint32_t { oneXStates = 0x119C, evdoStates = 0x1183, systems = 0x134F, frames = 0x119D };
+enum Code : std::uint32_t {
+    oneXStates = 0x119C,
+    evdoStates = 0x1183,
+    systems = 0x134F,
+    frames = 0x119D,
+    forwardLink = 0x1192,
+    reverseLink = 0x127E
+};
 
 /// How much of a new frame goes into the average of their errors.
 constexpr double averaging = 1.0 / 64;
@@ -69,6 +76,7 @@ void C2KTruth::follow(TruthTime at, std::optional<std::uint32_t> sent) {
     _evdo.update(at, nameOf(phone.evdo), code == evdoStates);
     _session.update(at, nameOf(phone.session), code == evdoStates);
     followMeasurements(at, code);
+    followTraffic(at, code);
     _oneXCell.update(at, oneXServing(code));
     _evdoCell.update(at, evdoServing(code));
 }
@@ -103,7 +111,27 @@ void C2KTruth::followMeasurements(TruthTime at, std::uint32_t code) {
     }
 }
 
+void C2KTruth::followTraffic(TruthTime at, std::uint32_t code) {
+    const auto count = [](std::optional<std::int64_t>& last, std::optional<bool>& isMoving,
+                          std::int64_t bits) {
+        if (last)
+            isMoving = bits != *last;
+        last = bits;
+    };
+    const ForwardPackets& forward = _context.forward;
+    const ReversePackets& reverse = _context.reverse;
+    if (code == forwardLink)
+        count(_received, _isReceiving, 1024 * forward.of1024 + 2048 * forward.of2048 + 4096 * forward.of4096);
+    else if (code == reverseLink)
+        count(_sent, _isSending, 256 * reverse.of256 + 1024 * reverse.of1024 + 4096 * reverse.of4096);
+    const bool isStalled = _isReceiving == false && _isSending == true;
+    _stall.measure(at, isStalled, !isStalled);
+    if (code != 0)
+        _stall.confirm(at);
+}
+
 void C2KTruth::finish() {
+    _stall.finish();
     _conditions.finish();
     _errors.finish();
 }

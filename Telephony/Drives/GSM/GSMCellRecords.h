@@ -27,6 +27,7 @@ enum class RRState : std::uint8_t {
     UMTSToGSMReselection = 14,
     GSMToUMTSReselection = 18,
     GSMToUMTSHandover = 19,
+    CellReestablishment = 20,
 };
 
 /// The reference of a neighbour's path-loss criterion: the lowest level at which a cell may be used.

@@ -114,6 +114,32 @@ void GSMProcedures::endCall(double now) {
     addGMMStep(now + 1.4, GMMState::Registered, GMMSubState::NormalService);
 }
 
+void GSMProcedures::tryReestablishment(double now) {
+    addRRStep(now, RRState::CellReestablishment);
+    addMMStep(now + 0.1, MMState::WaitForReestablishDecision, MMSubState::NormalService);
+    addMMStep(now + 0.4, MMState::WaitForRRConnectionReestablishment, MMSubState::NormalService);
+    addRRStep(now + 0.9, RRState::GoingActive);
+}
+
+void GSMProcedures::reestablishCall(double now) {
+    tryReestablishment(now);
+    addDedicatedChannelStep(now + 1.2);
+    addMMStep(now + 1.5, MMState::ReestablishmentInitiated, MMSubState::NormalService);
+    addRRStep(now + 1.8, RRState::DataTransfer);
+    addMMStep(now + 2.3, MMState::ConnectionActive, MMSubState::NormalService);
+}
+
+void GSMProcedures::loseCall(double now) {
+    tryReestablishment(now);
+    addRRStep(now + 5.0, RRState::Idle);
+    addStep(now + 5.1, [this]() -> std::optional<RecordBuilder> {
+        _phone.connection = GSMPhone::Connection::None;
+        return std::nullopt;
+    });
+    addMMStep(now + 5.4, MMState::Idle, MMSubState::NormalService);
+    addGMMStep(now + 5.7, GMMState::Registered, GMMSubState::NormalService);
+}
+
 void GSMProcedures::handOverToUMTS(double now) {
     addRRStep(now, RRState::GSMToUMTSHandover);
     addStep(now + 0.6, [this] { return campOnUMTS(); });

@@ -101,6 +101,7 @@ Report network(Context& context) {
 }
 
 Report rankedGSM(Context& context) {
+    context.isRankedUMTS = false;
     return rankedGSMCells(gsmNeighbours(context, 8));
 }
 

@@ -20,6 +20,7 @@ struct GSMReportContext {
     bool binary = false;        ///< the form of the next property list; reports toggle it
     std::int64_t crcs = 0;      ///< transport blocks so far
     std::int64_t crcErrors = 0; ///< those that came wrong
+    bool isRankedUMTS = false;  ///< whether the last ranked list was of UMTS
     int subFrames = 0;          ///< HSDPA sub-frames so far, modulo 1024
 };
 

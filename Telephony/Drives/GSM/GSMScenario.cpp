@@ -33,9 +33,32 @@ const DriveScenario::Phase GSMScenario::phases[] = {
     {6, &GSMScenario::begin<&GSMProcedures::powerOff>},
 };
 
+const DriveScenario::Phase GSMScenario::incidents[] = {
+    {9, &GSMScenario::begin<&GSMProcedures::powerOn>},
+    {7, &GSMScenario::begin<&GSMProcedures::attach>},
+    {5, nullptr},
+    {12, &GSMScenario::begin<&GSMProcedures::startCall>},
+    {12, &GSMScenario::begin<&GSMProcedures::reestablishCall>},
+    {8, &GSMScenario::begin<&GSMProcedures::endCall>},
+    {12, &GSMScenario::begin<&GSMProcedures::startCall>},
+    {15, &GSMScenario::begin<&GSMProcedures::loseCall>},
+    {60, &GSMScenario::holdOn},
+    {15, &GSMScenario::letGo},
+    {12, &GSMScenario::reselectEarly},
+    {12, &GSMScenario::reselectEarly},
+    {60, &GSMScenario::holdOn},
+    {15, &GSMScenario::letGo},
+    {12, &GSMScenario::reselectEarly},
+    {6, &GSMScenario::begin<&GSMProcedures::powerOff>},
+};
+
 GSMScenario::GSMScenario(std::uint64_t seed)
     : DriveScenario(seed ^ 0x5EED, phases), _network(seed),
       _procedures(_phone, _network, script()), _context{_phone, _network, random()} {}
+
+void GSMScenario::addIncidents() {
+    setRound(incidents);
+}
 
 std::string_view GSMScenario::technology() const {
     return kVoxLogChannelTechnology_Ostrel_GSM;
@@ -49,6 +72,16 @@ void GSMScenario::drive(double seconds) {
         _phone.umts = updatedMeasurement(_phone.umts, _network.umts());
 }
 
+void GSMScenario::reselectEarly() {
+    constexpr int margin_dB = 4;
+    for (const GSMMeasurement& each : _network.gsm())
+        if (_phone.gsm.cell && each.cell != _phone.gsm.cell &&
+            each.rssi_dBm <= _phone.gsm.rssi_dBm - margin_dB) {
+            _procedures.reselectWithinGSM(now(), each);
+            return;
+        }
+}
+
 void GSMScenario::react() {
     if (!script().empty())
         return;
@@ -57,7 +90,7 @@ void GSMScenario::react() {
     const bool better =
         (gsm && _network.gsm().front().rssi_dBm >= _phone.gsm.rssi_dBm + reselectionMargin_dB) ||
         (umts && _network.umts().front().rscp_dBm >= _phone.umts.rscp_dBm + reselectionMargin_dB);
-    if (timeToReselect(better, reselectionTime_s)) {
+    if (timeToReselect(better && !_isHoldingOn, reselectionTime_s)) {
         if (gsm)
             _procedures.reselectWithinGSM(now(), _network.gsm().front());
         else

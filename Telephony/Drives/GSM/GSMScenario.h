@@ -36,6 +36,9 @@ public:
     explicit GSMScenario(std::uint64_t seed);
     [[nodiscard]] std::string_view technology() const override;
     void setIdentities(const DriveIdentities& identities) override { _phone.identities = identities; }
+    /// Calls whose radio link fails, one of which is re-established and one is not, and reselections that
+    /// come late and early, in a round of less than five minutes.
+    void addIncidents() override;
 
     /// What the messages are of: the phone and the cells around it after the last step.
     [[nodiscard]] const GSMPhone& phone() const { return _phone; }
@@ -43,12 +46,19 @@ public:
 
 private:
     static const Phase phases[];
+    static const Phase incidents[];
 
     /// Begins that procedure now.
     template <void (GSMProcedures::*procedure)(double now)>
     void begin() {
         (_procedures.*procedure)(now());
     }
+
+    /// The phone stays on its cell, however weak, until `letGo`.
+    void holdOn() { _isHoldingOn = true; }
+    void letGo() { _isHoldingOn = false; }
+    /// Reselects to the best cell that is weaker.
+    void reselectEarly();
 
     void drive(double seconds) override;
     [[nodiscard]] const RadioNetwork& road() const override { return _network; }
@@ -61,6 +71,7 @@ private:
     GSMPhone _phone;
     GSMProcedures _procedures;
     GSMReportContext _context;
+    bool _isHoldingOn = false;
 };
 
 } // namespace velmora

@@ -22,6 +22,7 @@ std::string_view nameOf(records::RRState state) {
     case UMTSToGSMReselection: return "W2G interRAT reselection";
     case GSMToUMTSReselection: return "G2W interRAT reselection";
     case GSMToUMTSHandover: return "G2W interRAT handover";
+    case CellReestablishment: return "cell reest";
     }
     return "";
 }
@@ -65,8 +66,11 @@ std::string_view nameOf(records::MMState state) {
     case WaitForRRConnectionLU: return "wait for RR connection LU";
     case WaitForRRConnectionMM: return "wait for RR connection MM";
     case WaitForRRConnectionIMSIDetach: return "wait for RR connection IMSI detach";
+    case ReestablishmentInitiated: return "reestablishment initiated";
     case WaitForRRActive: return "wait for RR active";
     case Idle: return "idle";
+    case WaitForRRConnectionReestablishment: return "wait for RR connection reestablishment";
+    case WaitForReestablishDecision: return "wait for reestablish decision";
     }
     return "";
 }

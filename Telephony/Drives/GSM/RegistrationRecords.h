@@ -33,8 +33,11 @@ enum class MMState : std::uint8_t {
     WaitForRRConnectionLU = 13,
     WaitForRRConnectionMM = 14,
     WaitForRRConnectionIMSIDetach = 15,
+    ReestablishmentInitiated = 17,
     WaitForRRActive = 18,
     Idle = 19,
+    WaitForRRConnectionReestablishment = 21,
+    WaitForReestablishDecision = 22,
 };
 
 enum class MMSubState : std::uint8_t {

@@ -40,6 +40,7 @@ std::vector<UMTSMeasurement> neighbours(const GSMReportContext& context, std::si
 }
 
 std::optional<RecordBuilder> rankedCells(GSMReportContext& context) {
+    context.isRankedUMTS = true;
     return rankedUMTSCells(neighbours(context, 8));
 }
 

@@ -42,8 +42,20 @@ const DriveScenario::Phase LTEScenario::phases[] = {
     {5, &LTEScenario::powerOff},
 };
 
+const DriveScenario::Phase LTEScenario::incidents[] = {
+    {5, &LTEScenario::powerOn},       {5, &LTEScenario::registerWithNetwork},
+    {50, &LTEScenario::holdOn},       {10, &LTEScenario::letGo},
+    {8, &LTEScenario::reselectEarly}, {8, &LTEScenario::reselectEarly},
+    {50, &LTEScenario::holdOn},       {10, &LTEScenario::letGo},
+    {8, &LTEScenario::reselectEarly}, {5, &LTEScenario::powerOff},
+};
+
 LTEScenario::LTEScenario(std::uint64_t seed)
     : DriveScenario(seed ^ 0x5EED, phases), _network(seed), _context{_phone, _network, random()} {}
+
+void LTEScenario::addIncidents() {
+    setRound(incidents);
+}
 
 std::string_view LTEScenario::technology() const {
     return kVoxLogChannelTechnology_Ostrel_LTE;
@@ -52,8 +64,12 @@ std::string_view LTEScenario::technology() const {
 std::optional<RecordBuilder> LTEScenario::camp() {
     if (_network.cells(_phone.carrier).empty())
         return std::nullopt;
+    return campOn(_network.cells(_phone.carrier).front());
+}
+
+std::optional<RecordBuilder> LTEScenario::campOn(const LTEMeasurement& cell) {
     _phone.radio = LTEPhone::Radio::Camped;
-    _phone.serving = _network.cells(_phone.carrier).front();
+    _phone.serving = cell;
     _phone.average = *_phone.serving;
     _phone.cyclesBelow = 0;
     return lteReports::servingCell(_context);
@@ -145,6 +161,15 @@ void LTEScenario::powerOff() {
     });
 }
 
+void LTEScenario::reselectEarly() {
+    constexpr double margin_dB = 4;
+    for (const LTEMeasurement& each : _network.cells(_phone.carrier))
+        if (_phone.serving && each.rsrp_dBm <= _phone.serving->rsrp_dBm - margin_dB) {
+            addStep(0, [this, each] { return campOn(each); });
+            return;
+        }
+}
+
 void LTEScenario::drive(double seconds) {
     _network.drive(seconds);
     if (!_phone.serving)
@@ -160,7 +185,7 @@ void LTEScenario::react() {
     const auto& cells = _network.cells(_phone.carrier);
     const bool better = _phone.serving && !cells.empty() &&
                         cells.front().rsrp_dBm >= _phone.serving->rsrp_dBm + reselectionMargin_dB;
-    if (timeToReselect(better, reselectionTime_s))
+    if (timeToReselect(better && !_isHoldingOn, reselectionTime_s))
         addStep(0, [this] { return camp(); });
     updateArea();
 }
@@ -202,7 +227,7 @@ UnusualMessageParts LTEScenario::unusualMessageParts(std::size_t number) {
 }
 
 std::unique_ptr<DriveTruth> LTEScenario::makeTruth(TruthSink& sink) const {
-    return std::make_unique<LTETruth>(_phone, _network, sink);
+    return std::make_unique<LTETruth>(_context, sink);
 }
 
 } // namespace velmora

@@ -37,6 +37,8 @@ public:
     explicit LTEScenario(std::uint64_t seed);
     [[nodiscard]] std::string_view technology() const override;
     void setIdentities(const DriveIdentities& identities) override { _phone.identities = identities; }
+    /// Reselections that come late and early, in a round of less than three minutes.
+    void addIncidents() override;
 
     /// What the messages are of: the phone and the cells around it after the last step.
     [[nodiscard]] const LTEPhone& phone() const { return _phone; }
@@ -44,6 +46,7 @@ public:
 
 private:
     static const Phase phases[];
+    static const Phase incidents[];
 
     /// The phone's procedures; each adds its steps to the script, from now on.
     void powerOn();
@@ -56,6 +59,11 @@ private:
     /// Sends a tracking area update if the network has another area.
     void updateArea();
     void powerOff();
+    /// The phone stays on its cell, however weak, until `letGo`.
+    void holdOn() { _isHoldingOn = true; }
+    void letGo() { _isHoldingOn = false; }
+    /// Reselects to the best cell that is weaker.
+    void reselectEarly();
 
     void drive(double seconds) override;
     [[nodiscard]] const RadioNetwork& road() const override { return _network.radio(); }
@@ -66,12 +74,14 @@ private:
 
     /// Camps on the best cell of the phone's carrier, where there is one, and reports it.
     std::optional<RecordBuilder> camp();
+    std::optional<RecordBuilder> campOn(const LTEMeasurement& cell);
     void addConnectedStep(double delay, bool connected);
     void addContextsStep(double delay, int count);
 
     LTENetwork _network;
     LTEPhone _phone;
     LTEReportContext _context;
+    bool _isHoldingOn = false;
 };
 
 } // namespace velmora

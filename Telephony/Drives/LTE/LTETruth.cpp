@@ -7,6 +7,7 @@
 
 #include <cmath>
 #include <string>
+#include <utility>
 #include <vector>
 
 namespace velmora {
@@ -18,13 +19,20 @@ enum Code : std::uint32_t {
     antennas = 0xB0C1,
     connectedMeasurements = 0xB179,
     idleMeasurements = 0xB17F,
+    idleNeighbours = 0xB180,
     candidates = 0xB186,
 };
 
 constexpr std::size_t reportedNeighbours = 6;
+/// So many reports of neighbours are a turn: the last one is of another carrier.
+constexpr std::size_t carrierTurns = 4;
 
 double rounded(double value, double step) {
     return step * std::round(value / step);
+}
+
+TruthCell truthOf(const LTECell& cell) {
+    return {"LTE", lteCarriers[cell.carrier].downlink, cell.physicalId, cell.identity};
 }
 
 } // namespace
@@ -32,29 +40,57 @@ double rounded(double value, double step) {
 void LTETruth::follow(TruthTime at, std::optional<std::uint32_t> sent) {
     const std::uint32_t code = sent.value_or(0);
     followMode(at, code);
+    if (const std::optional<TruthMove> move = _cell.update(at, serving(code))) {
+        _reselections.move(at, *move);
+        _conditions.changeCell(at);
+        _hasNeighbours = false;
+    }
     followMeasurements(at, code);
-    if (sent)
+    followNeighbours(at, code);
+    if (sent) {
         _conditions.confirm(at);
-    _cell.update(at, serving(code));
+        _reselections.confirm(at);
+    }
     if (code == ExtraCode::packetDataContexts)
         _contexts.state(at, _phone.contexts);
     _area.update(at, std::to_string(_phone.registeredArea.lac), code == ExtraCode::simFiles);
 }
 
 void LTETruth::followMeasurements(TruthTime at, std::uint32_t code) {
-    if (!_phone.serving)
+    if (!_phone.serving) {
         _conditions.lose(at);
+        _reselections.forget();
+    }
     if (!_phone.serving || (code != connectedMeasurements && code != idleMeasurements))
         return;
     // The modem measures in these steps, those of RSRP upwards from -140 dBm.
     const double step_dB = code == idleMeasurements ? 0.25 : 0.125;
     _conditions.measureLevel(at, "LTE", rounded(_phone.serving->rsrp_dBm, 0.25));
     _conditions.measureQuality(at, "LTE", rounded(_phone.serving->rsrq_dB, step_dB));
-    std::vector<double> neighbours;
-    for (const LTEMeasurement& each : _network.cells(_phone.carrier))
-        if (each.cell != _phone.serving->cell && neighbours.size() < reportedNeighbours)
-            neighbours.push_back(each.rsrp_dBm);
-    _conditions.measureNeighbours(at, _phone.serving->rsrp_dBm, neighbours);
+    _conditions.compareServing(at, rounded(_phone.serving->rsrp_dBm, 0.25));
+    _reselections.measureServing(at, rounded(_phone.serving->rsrp_dBm, 0.25));
+}
+
+void LTETruth::followNeighbours(TruthTime at, std::uint32_t code) {
+    if (code != connectedMeasurements && code != idleNeighbours)
+        return;
+    if (code == idleNeighbours && (_context.neighbours - 1) % carrierTurns == carrierTurns - 1) {
+        if (!_hasNeighbours)
+            _conditions.compareNeighbours(at, {}, true); // none on the serving cell's carrier
+        return;
+    }
+    const double step_dB = code == idleNeighbours ? 0.5 : 0.25;
+    std::vector<double> levels;
+    std::vector<TruthLevel> neighbours;
+    for (const LTEMeasurement& each : _context.network.cells(_phone.carrier)) {
+        if ((_phone.serving && each.cell == _phone.serving->cell) || levels.size() == reportedNeighbours)
+            continue;
+        levels.push_back(rounded(each.rsrp_dBm, step_dB));
+        neighbours.push_back({truthOf(each.cell), levels.back()});
+    }
+    _hasNeighbours = !levels.empty();
+    _conditions.compareNeighbours(at, std::move(levels), _hasNeighbours);
+    _reselections.measureNeighbours(at, std::move(neighbours));
 }
 
 void LTETruth::followMode(TruthTime at, std::uint32_t code) {
@@ -76,8 +112,7 @@ TruthServing LTETruth::serving(std::uint32_t code) const {
     serving.isStated = code == ExtraCode::cellInformation;
     if (!_phone.serving)
         return serving;
-    const LTECell& cell = _phone.serving->cell;
-    serving.cell = {"LTE", lteCarriers[cell.carrier].downlink, cell.physicalId, cell.identity};
+    serving.cell = truthOf(_phone.serving->cell);
     serving.isStated |=
         code == cells || code == connectedMeasurements || code == idleMeasurements || code == candidates;
     return serving;

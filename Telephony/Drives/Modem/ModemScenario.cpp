@@ -55,8 +55,21 @@ const DriveScenario::Phase ModemScenario::phases[] = {
     {4, &ModemScenario::stopAnswering},
 };
 
+const DriveScenario::Phase ModemScenario::incidents[] = {
+    {6, &ModemScenario::plugInLocked},  {20, &ModemScenario::unlock},
+    {15, &ModemScenario::startSession}, {20, &ModemScenario::stall},
+    {15, &ModemScenario::flow},         {5, &ModemScenario::stall}, // too short for an event
+    {10, &ModemScenario::flow},         {15, &ModemScenario::changeToLTE},
+    {25, &ModemScenario::stall},        {15, &ModemScenario::flow},
+    {6, &ModemScenario::unplug},
+};
+
 ModemScenario::ModemScenario(std::uint64_t seed)
     : DriveScenario(seed ^ 0xA11, phases), _network(seed), _context{_phone, _network} {}
+
+void ModemScenario::addIncidents() {
+    setRound(incidents);
+}
 
 std::string_view ModemScenario::technology() const {
     return kVoxLogChannelTechnology_Modem;
@@ -110,6 +123,8 @@ void ModemScenario::drive(double seconds) {
     for (ModemBearer& each : _phone.bearers) {
         each.downlink_bps = _phone.serving ? capacityOf(*_phone.serving) * random().unit() : 0;
         each.uplink_bps = each.downlink_bps / 5;
+        if (_isStalled)
+            each.downlink_bps = 0;
     }
 }
 

@@ -32,6 +32,9 @@ public:
     explicit ModemScenario(std::uint64_t seed);
     [[nodiscard]] std::string_view technology() const override;
     void setIdentities(const DriveIdentities& identities) override { _phone.identities = identities; }
+    /// Sessions on GSM and on LTE in which nothing arrives for a while, in a round of less than three
+    /// minutes.
+    void addIncidents() override;
 
     /// What the messages are of: the modem and the cells around it after the last step.
     [[nodiscard]] const ModemPhone& phone() const { return _phone; }
@@ -39,6 +42,7 @@ public:
 
 private:
     static const Phase phases[];
+    static const Phase incidents[];
 
     /// What happens to the modem; each adds its steps to the script, from now on.
     void loseManager();
@@ -60,6 +64,8 @@ private:
     void returnWithoutSIM();
     void returnWithSIM();
     void stopAnswering();
+    void stall() { _isStalled = true; }
+    void flow() { _isStalled = false; }
 
     void drive(double seconds) override;
     [[nodiscard]] const RadioNetwork& road() const override { return _network.radio(); }
@@ -85,6 +91,7 @@ private:
     ModemPhone _phone;
     ModemReportContext _context;
     bool _isLimited = false; ///< the network denies its service
+    bool _isStalled = false; ///< nothing arrives, whatever is sent
     double _countedUntil = 0;
 };
 

@@ -5,8 +5,10 @@
 
 #include "LogMessages/LiveModem.h"
 
+#include <algorithm>
 #include <set>
 #include <string>
+#include <utility>
 #include <vector>
 
 namespace velmora {
@@ -39,7 +41,8 @@ std::string_view nameOf(ModemCell::Radio radio) {
 
 void ModemTruth::follow(TruthTime at, std::optional<std::uint32_t> sent) {
     const std::uint32_t code = sent.value_or(0);
-    _cell.update(at, serving(code));
+    if (_cell.update(at, serving(code)))
+        _conditions.changeCell(at);
     const bool isRegistrationStated = code == LiveModemCode::registration;
     if (_phone.isPresent())
         _registration.update(at, nameOf(_phone.registration), isRegistrationStated);
@@ -48,16 +51,21 @@ void ModemTruth::follow(TruthTime at, std::optional<std::uint32_t> sent) {
     if (_phone.isPresent() && !_phone.isLocked && !_phone.isSIMMissing)
         _sim.update(at, std::to_string(_phone.slot), code == LiveModemCode::sim);
     followMeasurements(at, code);
-    if (sent)
+    if (code == LiveModemCode::traffic)
+        followTraffic(at);
+    if (sent) {
         _conditions.confirm(at);
+        _stall.confirm(at);
+    }
     if (code == LiveModemCode::contexts)
         followContexts(at);
 }
 
 void ModemTruth::followMeasurements(TruthTime at, std::uint32_t code) {
-    if (!_phone.serving)
-        _conditions.lose(at);
     const bool isMeasured = _phone.cellReport == ModemCellReport::Reported && !_phone.isPlaceOnly;
+    // What a message does not name is not there any more.
+    if (!_phone.serving || (code == LiveModemCode::cells && !isMeasured))
+        _conditions.changeCell(at);
     if (!_phone.serving || code != LiveModemCode::cells || !isMeasured)
         return;
     const ModemCell& cell = *_phone.serving;
@@ -70,8 +78,13 @@ void ModemTruth::followMeasurements(TruthTime at, std::uint32_t code) {
 }
 
 void ModemTruth::followNeighbours(TruthTime at) {
-    if (_phone.radio == ModemCell::Radio::GSM || _phone.neighborReport != ModemCellReport::Reported) {
-        _conditions.measureNoNeighbours(at);
+    if (_phone.radio == ModemCell::Radio::GSM) {
+        _conditions.compareNoNeighbours();
+        return;
+    }
+    _conditions.compareServing(at, _phone.serving->level_dBm);
+    if (_phone.neighborReport != ModemCellReport::Reported) {
+        _conditions.compareNeighbours(at, {}, false);
         return;
     }
     const std::size_t reported = _phone.radio == ModemCell::Radio::UMTS ? 6 : 5;
@@ -80,7 +93,34 @@ void ModemTruth::followNeighbours(TruthTime at) {
         if (!each.isSameCellAs(*_phone.serving) && each.channel == _phone.serving->channel &&
             neighbours.size() < reported)
             neighbours.push_back(each.level_dBm);
-    _conditions.measureNeighbours(at, _phone.serving->level_dBm, neighbours);
+    const bool hasAny = cellsOf(_network, _phone.radio, _phone.carrier).size() > 1;
+    _conditions.compareNeighbours(at, std::move(neighbours), hasAny);
+}
+
+void ModemTruth::followTraffic(TruthTime at) {
+    std::vector<Counters> counters;
+    bool isStalled = false;
+    bool isUnknown = false;
+    for (const ModemBearer& each : _phone.bearers) {
+        if (!_phone.isPresent() || !each.isConnected || !each.last)
+            continue;
+        const ModemBearer::Answer& now = *each.last;
+        counters.push_back({each.number, each.start_s, now});
+        const auto known = std::find_if(_counters.begin(), _counters.end(), [&each](const Counters& other) {
+            return other.number == each.number && other.start_s == each.start_s;
+        });
+        // Two answers in a row have no rate.
+        if (known == _counters.end() || known->answer.at_s == now.at_s)
+            isUnknown = true;
+        else
+            isStalled =
+                isStalled || (now.received == known->answer.received && now.sent > known->answer.sent);
+    }
+    _counters = std::move(counters);
+    if (!isStalled && (isUnknown || _counters.empty()))
+        _stall.lose(at);
+    else
+        _stall.measure(at, isStalled, !isStalled);
 }
 
 void ModemTruth::followContexts(TruthTime at) {
@@ -104,6 +144,7 @@ TruthServing ModemTruth::serving(std::uint32_t code) const {
 }
 
 void ModemTruth::finish() {
+    _stall.finish();
     _conditions.finish();
     _limited.finish();
     _searching.finish();

@@ -52,7 +52,7 @@ void HeldCondition::confirmLoss(TruthTime at) {
 
 void HeldCondition::finish() {
     if (_isLasting)
-        tell(std::nullopt);
+        tell(_ending); // which has only not held for long enough
 }
 
 void HeldCondition::tell(std::optional<TruthTime> end) {

@@ -21,15 +21,15 @@ std::string_view kindOf(TruthMode mode) {
 
 } // namespace
 
-void StatedCell::update(TruthTime at, const TruthServing& serving) {
+std::optional<TruthMove> StatedCell::update(TruthTime at, const TruthServing& serving) {
     if (serving.cell != _now)
         change(serving);
     if (!serving.isStated)
-        return;
-    if (!_now)
-        _isAbsenceStated = true;
-    else if (_isPending)
-        state(at, serving.shown);
+        return std::nullopt;
+    if (_now && _isPending)
+        return state(at, serving.shown);
+    _isAbsenceStated = _isAbsenceStated || !_now;
+    return std::nullopt;
 }
 
 void StatedCell::change(const TruthServing& serving) {
@@ -42,13 +42,15 @@ void StatedCell::change(const TruthServing& serving) {
     _isAbsenceStated = false;
 }
 
-void StatedCell::state(TruthTime at, TruthMode shown) {
+std::optional<TruthMove> StatedCell::state(TruthTime at, TruthMode shown) {
+    std::optional<TruthMove> move;
     if (_stated && *_stated != *_now) {
         // Without a word of the time in between, the messages show a change that there was not.
         const bool isVisible = !_wasAbsent && shown == _mode;
         if (!_wasAbsent || !_isAbsenceStated)
             tell(at, kindOf(_wasAbsent ? TruthMode::Unknown : _mode), *_now, !isVisible);
         if (!_wasAbsent) {
+            move = TruthMove{*_stated, *_now, isVisible ? _mode : TruthMode::Unknown};
             if (_stated->radio != _now->radio)
                 tell(at, "technology-change", *_now, false);
             returnTo(at);
@@ -58,6 +60,7 @@ void StatedCell::state(TruthTime at, TruthMode shown) {
         _left.reset();
     _stated = _now;
     _wasAbsent = _isAbsenceStated = _isPending = false;
+    return move;
 }
 
 void StatedCell::misstate(TruthTime at, const TruthCell& cell) {

@@ -32,6 +32,12 @@ struct TruthServing {
     TruthMode shown = TruthMode::Idle; ///< the mode that the latest message about it showed
 };
 
+/// A change of the cell that a message has stated.
+struct TruthMove {
+    TruthCell from, to;
+    TruthMode mode = TruthMode::Idle;
+};
+
 /// The phone's serving cell and what messages have stated of it: reselections, handovers, changes of the
 /// radio technology, and the return to a cell that it has just left. The first cell after a search is none of
 /// them.
@@ -39,7 +45,8 @@ class StatedCell {
 public:
     explicit StatedCell(TruthSink& sink) : _sink(sink) {}
 
-    void update(TruthTime at, const TruthServing& serving);
+    /// Returns the change that the message of this moment states, if it is one that messages show.
+    std::optional<TruthMove> update(TruthTime at, const TruthServing& serving);
     /// A message of this moment states a cell although the phone is on none; the changes to it and from it
     /// are hidden.
     void misstate(TruthTime at, const TruthCell& cell);
@@ -52,7 +59,7 @@ private:
 
     void change(const TruthServing& serving);
     /// The new cell is stated.
-    void state(TruthTime at, TruthMode shown);
+    std::optional<TruthMove> state(TruthTime at, TruthMode shown);
     void tell(TruthTime at, std::string_view kind, const TruthCell& to, bool isHidden);
     void returnTo(TruthTime at);
 

@@ -58,10 +58,7 @@ KINDS = {
     "fer-alarm": Kind(DERIVED, 2),
 }
 
-SHOWN_ONLY = {
-    ("pilot-pollution", "gsm"): "the levels of serving cell and neighbours are of different times and rounded differently",
-    ("pilot-pollution", "lte"): "the levels of serving cell and neighbours are of different times",
-}
+SHOWN_ONLY: dict[tuple[str, str], str] = {}
 """Where a kind is short in a scenario, and why: the figures are shown, and nothing is asked of them."""
 
 

@@ -18,7 +18,8 @@ DESCRIPTION = """Precision and recall of each kind of events.
 
 make-drive writes a round of each scenario with each seed, and what its phone did (--truth); velmora-log events
 lists what it finds in the recording. Each event that happened is matched with at most one that was found, of the
-same kind and within the kind's tolerance. What no record states is not counted. Gaps and clock jumps are those of a
+same kind and within the kind's tolerance. What no record states is not counted. Scenarios that have a round of
+incidents, as lost calls, are measured in both rounds. Gaps and clock jumps are those of a
 copy of each recording with silences and clocks that go back, and changes of an address those of another.
 
 The exit status is 1 when a kind that records state is not found exactly, or a derived one with less than 0.98 of

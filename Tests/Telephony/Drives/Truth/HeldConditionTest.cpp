@@ -87,6 +87,14 @@ TEST_F(HeldConditionTest, itHasNoEndWhereNothingIsMeasuredForTenSeconds) {
     EXPECT_THAT(linesOf(truth), ElementsAre("10 poor-quality"));
 }
 
+TEST_F(HeldConditionTest, whatHasOnlyToHoldAtTheEndHasOne) {
+    poor(10s);
+    poor(15s);
+    good(18s);
+    condition.finish();
+    EXPECT_THAT(linesOf(truth), ElementsAre("10-18 poor-quality"));
+}
+
 TEST_F(HeldConditionTest, whatIsNotMeasuredDoesNotBegin) {
     poor(10s);
     condition.lose(11s);
@@ -123,14 +131,42 @@ TEST(RadioConditionsTest, threeNeighboursOfNearlyItsLevelPolluteTheServingCell) 
     KeptTruth truth;
     RadioConditions conditions(truth);
     const auto measure = [&](TruthTime at, const std::vector<double>& neighbours_dBm) {
-        conditions.measureNeighbours(at, -90, neighbours_dBm);
-        conditions.confirm(at + 5s);
+        for (TruthTime each = at; each <= at + 5s; each += 1s) {
+            conditions.compareServing(each, -90);
+            conditions.compareNeighbours(each, neighbours_dBm, true);
+            conditions.confirm(each);
+        }
     };
     measure(0s, {-94, -94});
     measure(10s, {-80, -94, -94.9, -95});
     measure(20s, {-80, -94, -96.9}); // three within 7 dB
     measure(30s, {-80, -94, -97});
     EXPECT_THAT(linesOf(truth), ElementsAre("10-30 pilot-pollution"));
+}
+
+TEST(RadioConditionsTest, anOldLevelOfTheServingCellIsNotCompared) {
+    KeptTruth truth;
+    RadioConditions conditions(truth);
+    conditions.compareServing(0s, -90);
+    for (TruthTime at{0}; at <= 20s; at += 1s) {
+        conditions.compareNeighbours(at, {-90, -90, -90}, true);
+        conditions.confirm(at);
+    }
+    conditions.finish();
+    EXPECT_THAT(linesOf(truth), IsEmpty());
+}
+
+TEST(RadioConditionsTest, whatOneCellHadIsNotKnownOfTheNext) {
+    KeptTruth truth;
+    RadioConditions conditions(truth);
+    conditions.measureLevel(0s, "LTE", -116);
+    conditions.confirm(0s);
+    conditions.changeCell(4s);
+    conditions.confirm(5s);
+    conditions.measureLevel(6s, "LTE", -90);
+    conditions.confirm(6s);
+    conditions.finish();
+    EXPECT_THAT(linesOf(truth), IsEmpty());
 }
 
 } // namespace
