@@ -292,7 +292,8 @@ int run(int argc, char** argv, int seconds, bool probes, bool hasDrive) {
     constexpr int settled_ms = 5000;
     double begun_ms = 0;
     double used_ms = 0;
-    QTimer::singleShot(0, [hasDrive] {
+    constexpr int shown_ms = 1000;
+    QTimer::singleShot(shown_ms, [hasDrive] {
         if (hasDrive)
             widen();
     });
