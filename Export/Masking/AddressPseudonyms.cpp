@@ -21,6 +21,10 @@ constexpr std::array<std::array<std::uint8_t, 3>, 3> documentNetworks = {
     {{192, 0, 2}, {198, 51, 100}, {203, 0, 113}}};
 constexpr std::array<std::uint8_t, 4> documentPrefix = {0x20, 0x01, 0x0D, 0xB8};
 constexpr unsigned hostsOfNetwork = 254;
+constexpr unsigned documentHosts = documentNetworks.size() * hostsOfNetwork;
+// Of 198.18.0.0/15, in networks of 24 bits.
+constexpr std::array<std::uint8_t, 2> benchmarkPrefix = {198, 18};
+constexpr unsigned benchmarkNetworks = 512;
 
 template <class Address>
 bool isUnspecified(const Address& address) {
@@ -59,11 +63,19 @@ Version4 AddressPseudonyms::version4(const Version4& address) const {
     if (isUnspecified(address))
         return address;
     const KeyedHash::Digest digest = _hash(messageOf(address));
-    const unsigned high = digest[0];
-    const unsigned middle = digest[1];
-    const unsigned number = (high << 16 | middle << 8 | digest[2]) % (3 * hostsOfNetwork);
-    const auto& network = documentNetworks[number / hostsOfNetwork];
-    return {network[0], network[1], network[2], static_cast<std::uint8_t>(1 + number % hostsOfNetwork)};
+    std::uint32_t number = 0;
+    for (std::size_t i = 0; i < sizeof number; ++i)
+        number = number << 8 | digest[i];
+    number %= documentHosts + benchmarkNetworks * hostsOfNetwork;
+    const auto host = [](unsigned index) { return static_cast<std::uint8_t>(1 + index % hostsOfNetwork); };
+    if (number < documentHosts) {
+        const auto& network = documentNetworks[number / hostsOfNetwork];
+        return {network[0], network[1], network[2], host(number)};
+    }
+    number -= documentHosts;
+    const unsigned network = number / hostsOfNetwork;
+    return {benchmarkPrefix[0], static_cast<std::uint8_t>(benchmarkPrefix[1] + network / 256),
+            static_cast<std::uint8_t>(network % 256), host(number)};
 }
 
 Version6 AddressPseudonyms::version6(const Version6& address) const {
@@ -91,7 +103,9 @@ std::optional<std::string> AddressPseudonyms::text(std::string_view address) con
 
 bool isDocumentationAddress(std::string_view address) {
     if (const auto four = read<Version4>(bare(address), AF_INET))
-        return isUnspecified(*four) || std::ranges::any_of(documentNetworks, [&](const auto& network) {
+        return isUnspecified(*four) ||
+               ((*four)[0] == benchmarkPrefix[0] && ((*four)[1] & ~1U) == benchmarkPrefix[1]) ||
+               std::ranges::any_of(documentNetworks, [&](const auto& network) {
                    return std::equal(network.begin(), network.end(), four->begin());
                });
     const auto six = read<Version6>(bare(address), AF_INET6);

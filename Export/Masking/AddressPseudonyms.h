@@ -14,8 +14,9 @@
 namespace velmora {
 
 /// Pseudonyms of addresses: those that are reserved for documents, 192.0.2.0/24, 198.51.100.0/24 and
-/// 203.0.113.0/24 (RFC 5737) and 2001:db8::/32 (RFC 3849). There are but 762 of version 4, so that two
-/// addresses may have the same.
+/// 203.0.113.0/24 (RFC 5737) and 2001:db8::/32 (RFC 3849), and, since the former are but 762, for benchmarks,
+/// 198.18.0.0/15 (RFC 2544), which no public network routes (RFC 6890). Of version 4 there are 130,810 in
+/// all, so that two addresses may have the same.
 class AddressPseudonyms {
 public:
     /// `hash` must outlive it.
@@ -34,7 +35,7 @@ private:
     const KeyedHash& _hash;
 };
 
-/// Whether the text is an address that is reserved for documents, or the unspecified one.
+/// Whether the text is an address that is reserved for documents or benchmarks, or the unspecified one.
 [[nodiscard]] bool isDocumentationAddress(std::string_view address);
 
 } // namespace velmora

@@ -133,7 +133,7 @@ TEST_F(PropertyListMaskTest, ContextsGetAddressesForDocuments) {
                   .asDictionary()
                   ->find("PDP Address")
                   ->asString()[0],
-              "192.0.2.183");
+              "198.19.0.157");
     EXPECT_EQ(_report.of(Masked::Address), 2U);
 }
 

@@ -115,8 +115,8 @@ TEST_F(PseudonymsTest, EveryNumberOfAWidthHasAPseudonymOfItsOwn) {
 
 TEST_F(PseudonymsTest, AddressesAreThoseForDocuments) {
     const AddressPseudonyms& addresses = _identities.addresses;
-    EXPECT_EQ(addresses.text("10.64.3.7"), "192.0.2.183");
-    EXPECT_EQ(addresses.text("10.64.3.7/29"), "192.0.2.183/29");
+    EXPECT_EQ(addresses.text("10.64.3.7"), "198.19.0.157");
+    EXPECT_EQ(addresses.text("10.64.3.7/29"), "198.19.0.157/29");
     EXPECT_EQ(addresses.text("2001:db8::17"), "2001:db8:9afb:eb81:cbe0:ee8a:2f2c:3a8c");
     EXPECT_EQ(addresses.text("2001:DB8:0:0::0017"), "2001:db8:9afb:eb81:cbe0:ee8a:2f2c:3a8c");
     EXPECT_EQ(addresses.text("0.0.0.0"), "0.0.0.0");
@@ -125,6 +125,23 @@ TEST_F(PseudonymsTest, AddressesAreThoseForDocuments) {
     EXPECT_FALSE(addresses.text("10.64.3.7 and more"));
     EXPECT_TRUE(isDocumentationAddress("198.51.100.9"));
     EXPECT_FALSE(isDocumentationAddress("198.51.101.9"));
+    EXPECT_TRUE(isDocumentationAddress("198.18.0.1"));
+    EXPECT_TRUE(isDocumentationAddress("198.19.255.254"));
+    EXPECT_FALSE(isDocumentationAddress("198.17.255.254"));
+    EXPECT_FALSE(isDocumentationAddress("198.20.0.1"));
+}
+
+TEST_F(PseudonymsTest, AddressesSeldomHaveTheSamePseudonym) {
+    // Of 2000 drawn from 130,810 some 15 are expected twice: 2000 * 1999 / 2 / 130,810.
+    std::set<std::string> pseudonyms;
+    for (int i = 0; i < 2000; ++i) {
+        const std::string text = *_identities.addresses.text("10.64." + std::to_string(i / 250) + "." +
+                                                             std::to_string(1 + i % 250));
+        EXPECT_TRUE(isDocumentationAddress(text)) << text;
+        EXPECT_FALSE(text.ends_with(".0") || text.ends_with(".255")) << text;
+        pseudonyms.insert(text);
+    }
+    EXPECT_GT(pseudonyms.size(), 1960U);
 }
 
 TEST_F(PseudonymsTest, CheckDigitIsThatOfTheStandard) {
