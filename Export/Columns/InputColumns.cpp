@@ -23,15 +23,18 @@ InputColumns::InputColumns(InputFile file, const RuleSet& rules, TableOutputs& o
     : _file(std::move(file)), _rules(rules), _outputs(outputs) {}
 
 TechnologyTables& InputColumns::add(const Catalogue& catalogue) {
-    if (!_positions) {
-        const std::string technology(catalogue.technology());
-        _positions.emplace(positionsTable::layout(technology), _file.hash,
-                           _outputs.open("positions", technology), _compressor);
-        for (const Fix& fix : std::exchange(_early, {}))
-            positionsTable::add(*_positions, fix);
-    }
+    beginPositions(std::string(catalogue.technology()));
     return *_technologies.emplace_back(
         std::make_unique<TechnologyTables>(catalogue, _rules, _file.hash, _message, _outputs, _compressor));
+}
+
+void InputColumns::beginPositions(const std::string& technology) {
+    if (_positions)
+        return;
+    _positions.emplace(positionsTable::layout(technology), _file.hash, _outputs.open("positions", technology),
+                       _compressor);
+    for (const Fix& fix : std::exchange(_early, {}))
+        positionsTable::add(*_positions, fix);
 }
 
 void InputColumns::add(const Fix& fix) {

@@ -42,6 +42,9 @@ public:
     /// `rules`, whose events are in the tables, must outlive it.
     InputColumns(InputFile file, const RuleSet& rules, TableOutputs& outputs);
 
+    /// The input's first technology, by its short name, if that is known before it is added: fixes that come
+    /// earlier than that are kept otherwise.
+    void beginPositions(const std::string& technology);
     /// Adds a technology, and returns the sink for its observations.
     TechnologyTables& add(const Catalogue& catalogue);
     /// The messages that follow are of the technology of that short name, which has been added.

@@ -120,6 +120,8 @@ Outcome writeFile(const std::string& path, const HashedInput& input, const Begin
     const DecoderLog log(lines);
     // Below the mask, so that the position is that of the message by its own time.
     PositionedReader positioned(**reader);
+    if (options.technology.empty() && !begin.technology.empty())
+        columns.beginPositions(begin.technology);
     const bool hasPositions = !masking || masking->level != MaskLevel::All;
     if (hasPositions)
         positioned.setFixes([&columns](const Fix& fix) { columns.add(fix); });
