@@ -37,6 +37,8 @@ def all_cases() -> list[Case]:
         ConvertCase("c2k.pcapng", "drive.dlf", had=True),
         ConvertCase("gsm.pcapng", "drive.velmora", had=False),
         ConvertCase("gsm.pcapng", "drive.velmora", had=True),
+        ConvertCase("gsm.pcapng", "drive.sqlite", had=False),
+        ConvertCase("gsm.pcapng", "drive.sqlite", had=True),
         RecordCase(False, "some messages", count),
         RecordCase(True, "some messages", count),
         RecordCase(False, "a while", ["--duration", "1.3"]),
