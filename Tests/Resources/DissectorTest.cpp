@@ -251,10 +251,14 @@ TEST_F(Dissector, servesDisplayFilters) {
     std::size_t neighbours = 0;
     std::size_t sim = 0;
     std::size_t tooShort = 0;
+    std::size_t weak = 0;
     while (const auto message = (*reader)->next()) {
         const auto header = LogMessage::parse(message->message.bytes());
         tooShort += header ? 0U : 1U;
         neighbours += header && header->logCode() == 0xB180 ? 1U : 0U;
+        // Measured RSRP: nine bits from byte 21 on, a quarter of a dB each from -140 dBm.
+        if (header && header->logCode() == 0xB17F && header->record.size() >= 33)
+            weak += (header->record[21] + (header->record[22] & 1) * 256) * 0.25 - 140 < -105 ? 1U : 0U;
         sim += header && header->logCode() == 0xFF0000 ? 1U : 0U;
     }
     ASSERT_GT(neighbours, 0U);
@@ -264,6 +268,8 @@ TEST_F(Dissector, servesDisplayFilters) {
     EXPECT_EQ(count("velmora.sections == \"Neighbor Cells List\""), neighbours);
     EXPECT_EQ(count("velmora.sections contains \"SIM\""), sim);
     EXPECT_EQ(count("velmora.too_short"), tooShort);
+    ASSERT_GT(weak, 0U);
+    EXPECT_EQ(count("velmora.lte.serving_cell_measurements.measured_rsrp < -105"), weak);
     EXPECT_EQ(count("velmora.technology != \"Ostrel_LTE\""), 0U);
 }
 

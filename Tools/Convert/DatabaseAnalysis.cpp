@@ -34,7 +34,7 @@ void DatabaseAnalysis::report(const MessageReport& report) {
     _database.add({number, report.time, modemTime, _technology, observed.code, nameOf(observed.damage),
                    _channel, _cell});
     for (const Observation& observation : observed.observations)
-        if (wants(observation))
+        if (isWanted(observation))
             _database.add(number, _technology, observation);
 }
 
@@ -52,7 +52,7 @@ void DatabaseAnalysis::happened(const Event& event) {
         _database.add(event);
 }
 
-bool DatabaseAnalysis::wants(const Observation& observation) {
+bool DatabaseAnalysis::isWanted(const Observation& observation) {
     const CatalogueField& leaf = *observation.leaf;
     if (leaf.index >= _wanted.size())
         _wanted.resize(leaf.index + 1);

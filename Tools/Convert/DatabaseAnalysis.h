@@ -52,7 +52,7 @@ private:
     };
 
     void happened(const Event& event) override;
-    [[nodiscard]] bool wants(const Observation& observation);
+    [[nodiscard]] bool isWanted(const Observation& observation);
     void noteServing(const Observation& observation);
 
     std::string _technology;

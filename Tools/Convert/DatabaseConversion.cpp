@@ -8,6 +8,7 @@
 #include "Tools/Analysed/FileMessages.h"
 #include "Tools/Convert/DatabaseAnalysis.h"
 #include "Tools/Decode/ShownProgress.h"
+#include "Tools/Decode/TrackedResources.h"
 #include "Tools/Rules/RuleFiles.h"
 
 #include <memory>
@@ -48,8 +49,11 @@ Result<bool> convertToDatabase(MessageReader& reader, const Conversion& conversi
     Result<Database> database = Database::create(conversion.temporary);
     if (!database)
         return Failure{"cannot write " + conversion.name + ": " + database.reason()};
+    const TrackedResources resources;
     const AllCatalogues catalogues;
     const RuleSet rules = loadRules(catalogues, {});
+    if (!rules.errors().empty())
+        return Failure{rules.errors().front().message()};
     std::optional<RecordingDatabase> tables(*database);
     DatabaseChoice choice{conversion.attributes, conversion.messages, std::nullopt};
     Positions positions(reader, choice, *tables);
@@ -63,6 +67,10 @@ Result<bool> convertToDatabase(MessageReader& reader, const Conversion& conversi
     progress.clear();
     if (!read)
         return Failure{conversion.title + ": " + read.reason()};
+    if (reader.failure())
+        return Failure{conversion.title + ": " + reader.failure()->reason};
+    if (!resources.failure().empty())
+        return Failure{conversion.title + ": decoded without its template: " + resources.failure()};
     feed.finish();
     positions.finish();
     tables->finish();

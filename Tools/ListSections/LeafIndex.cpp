@@ -16,18 +16,19 @@ const CatalogueNode* listOf(const CatalogueNode* node) {
     return node ? node->parent() : nullptr;
 }
 
+void addOnce(std::vector<const CatalogueNode*>& lists, const CatalogueNode* list) {
+    if (std::find(lists.begin(), lists.end(), list) == lists.end())
+        lists.push_back(list);
+}
+
 } // namespace
 
 LeafIndex::LeafIndex(const Catalogue& catalogue) {
     for (const CatalogueField& leaf : catalogue.fields())
         for (const CatalogueSource& source : leaf.sources) {
             _leaves[{leaf.section, source.code, source.list, source.field}].push_back(&leaf);
-            if (!source.list)
-                continue;
-            auto& lists = _lists[{leaf.section, source.list}];
-            const CatalogueNode* const list = listOf(leaf.node);
-            if (std::find(lists.begin(), lists.end(), list) == lists.end())
-                lists.push_back(list);
+            if (source.list)
+                addOnce(_lists[{leaf.section, source.list}], listOf(leaf.node));
         }
 }
 

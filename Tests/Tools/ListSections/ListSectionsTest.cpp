@@ -42,6 +42,21 @@ TEST(ListSections, WantsEachTableOnceInTheTemplate) {
         EXPECT_EQ(listSections("dissector", source).status, 1) << source;
 }
 
+TEST(ListSections, PutsFieldsAndViewsAndPartsInPlaceOfTheirNames) {
+    const ShellOutcome outcome =
+        listSections("dissector", "@SECTIONS@\n@RECORDS@\n@FIELDS@\n@VIEWS@\n@PART times.lua@\n");
+    EXPECT_EQ(outcome.status, 0);
+    // 0xB17F: nine bits from bit 0 of byte 21 on, in quarters of a dB from -140 dBm.
+    EXPECT_THAT(
+        outcome.output,
+        AllOf(
+            HasSubstr(
+                "{\"velmora.lte.serving_cell_measurements.measured_rsrp\",\"Measured RSRP\",\"d\",\" dBm\"}"),
+            HasSubstr("{l=\"Measured RSRP\",f={"), HasSubstr("},o=21,w=9,a=0.25,c=-140}"),
+            HasSubstr("\n-- Time stamps ---")));
+    EXPECT_EQ(listSections("dissector", "@SECTIONS@\n@RECORDS@\n@PART nothing.lua@\n").status, 1);
+}
+
 /// The classes that it asks print lines of their own, which are not part of the source.
 TEST(ListSections, PrintsNothingButTheSource) {
     EXPECT_THAT(listSections("log-codes").output,

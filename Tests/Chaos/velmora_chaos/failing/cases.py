@@ -40,6 +40,8 @@ def all_cases() -> list[Case]:
         ConvertCase("gsm.pcapng", "drive.velmora", had=True),
         ReportCase("gsm.pcapng", had=False),
         ReportCase("lte.pcapng", had=True),
+        ConvertCase("gsm.pcapng", "drive.sqlite", had=False),
+        ConvertCase("gsm.pcapng", "drive.sqlite", had=True),
         RecordCase(False, "some messages", count),
         RecordCase(True, "some messages", count),
         RecordCase(False, "a while", ["--duration", "1.3"]),
