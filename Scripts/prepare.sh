@@ -12,7 +12,7 @@ build_packages=(build-essential cmake ninja-build qt6-base-dev libgl-dev libpugi
 test_packages=(libgtest-dev libgmock-dev librapidcheck-dev libbenchmark-dev nlohmann-json3-dev python3 tshark gpsd gpsd-clients
     gdal-bin libxml2-utils clang-format-14
     fonts-dejavu-core xvfb dbus at-spi2-core gir1.2-atspi-2.0 python3-gi desktop-file-utils appstream
-    modemmanager shellcheck reuse git lintian fakeroot file systemd python3-jsonschema mandoc bash-completion
+    modemmanager shellcheck reuse git lintian fakeroot file systemd python3-jsonschema mandoc bash-completion tmux
     mypy python3-pandas python3-dask python3-distributed procps chromium chromium-driver firefox-esr weston qt6-wayland)
 # shellcheck disable=SC2034
 fuzz_packages=(clang libclang-rt-14-dev)

@@ -4,9 +4,9 @@
 #pragma once
 
 #include "Tools/Browse/BrowseSession.h"
-#include "Tools/Browse/Prompt.h"
 #include "Tools/Browse/Screen/BrowseView.h"
 #include "Tools/Terminal/KeyPress.h"
+#include "Tools/Terminal/Prompt.h"
 #include "Tools/Terminal/ScreenSize.h"
 
 #include <cstddef>

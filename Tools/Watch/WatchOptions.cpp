@@ -27,9 +27,10 @@ CLI::App* addWatch(CLI::App& app, WatchOptions& options) {
         ->type_name("info|warning|critical");
     addMaskOption(*command, options.mask);
     command->footer(
-        "On a terminal the screen is redrawn in place: arrows, j, k, PgUp, PgDn, Home and End scroll,\n"
-        "q quits; a line above the last one has the latest events. On a pipe each refresh is printed, one\n"
-        "after another.\n\n" +
+        "On a terminal the screen is redrawn in place: arrows, j, k, PgUp, PgDn, Home and End scroll, / n N\n"
+        "search, f shows only rows with a text, ] [ go to the next and previous section, q quits; a line\n"
+        "above the last one has the latest events. On a pipe each refresh is printed, one after "
+        "another.\n\n" +
         std::string(maskHelp) +
         "\n"
         "Examples:\n"

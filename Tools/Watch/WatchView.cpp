@@ -6,6 +6,8 @@
 #include "Platform/PrintableText.h"
 #include "Tools/Report.h"
 
+#include <algorithm>
+#include <chrono>
 #include <utility>
 
 #include <unistd.h>
@@ -33,8 +35,9 @@ void PipeView::showNote(const std::string& note, const std::string& advice) {
 ScreenView::ScreenView(std::function<void()> quit)
     : _quit(std::move(quit)),
       _deferredLog(::isatty(STDERR_FILENO) != 0 ? std::make_unique<DeferredLog>() : nullptr),
-      _terminal({[this](std::string_view bytes) { handleInput(bytes); }, [this] { draw(); },
-                 [this] { _quit(); }}) {}
+      _terminal(
+          {[this](std::string_view bytes) { handleInput(bytes); }, [this] { draw(); }, [this] { _quit(); }}),
+      _escape([this] { take(_keys.finish()); }) {}
 
 void ScreenView::showRefresh(const std::string& status, std::vector<TreeRow> rows) {
     _status = status;
@@ -71,7 +74,7 @@ void ScreenView::showEvents(const std::string& line, bool rings) {
 /// that.
 std::vector<TreeRow> ScreenView::shownRows() const {
     if (!_rows.empty() || _advice.empty())
-        return _rows;
+        return _filter.empty() ? _rows : rowsWith(_rows, _filter);
     const std::size_t columns = _terminal.size().columns;
     const bool isCut = displayWidth(_status + " " + _note) > columns;
     return adviceRows(isCut ? _note + "; " + _advice : _advice, columns);
@@ -83,23 +86,88 @@ void ScreenView::restoreTerminal() {
         _deferredLog->release();
 }
 
+ScreenLayout ScreenView::layout() const {
+    return layoutOf(shownRows(), withoutEvents(_terminal.size(), _events));
+}
+
 void ScreenView::handleInput(std::string_view bytes) {
-    const std::size_t before = _scroll;
-    for (const KeyPress& press : _keys.take(bytes)) {
-        if (press.key == Key::Interrupt || press.text == "q") {
-            _quit();
-            return;
-        }
-        if (press.key == Key::Suspend)
+    constexpr std::chrono::milliseconds escapeDelay{50};
+    if (!take(_keys.take(bytes)))
+        return;
+    if (_keys.isWaiting())
+        _escape.startOnce(escapeDelay);
+    else
+        _escape.stop();
+}
+
+/// False once the user has quit.
+bool ScreenView::take(const std::vector<KeyPress>& presses) {
+    for (const KeyPress& press : presses) {
+        if (press.key == Key::Suspend) {
             _terminal.suspend();
-        _scroll = scrolledBy(scrollKey(press), _scroll,
-                             layoutOf(shownRows(), withoutEvents(_terminal.size(), _events)));
+        } else if (_prompt) {
+            takeInPrompt(press);
+        } else if (press.key == Key::Interrupt || press.text == "q") {
+            _quit();
+            return false;
+        } else if (const Key key = scrollKey(press); key != Key::Character) {
+            _scroll = scrolledBy(key, _scroll, layout());
+        } else {
+            takeLetter(press.text);
+        }
     }
-    if (_scroll != before)
+    if (!presses.empty())
         draw();
+    return true;
+}
+
+void ScreenView::takeInPrompt(const KeyPress& press) {
+    const Prompt::Outcome outcome = _prompt->take(press);
+    if (outcome == Prompt::Outcome::GoesOn)
+        return;
+    const Prompt prompt = *std::exchange(_prompt, std::nullopt);
+    if (outcome == Prompt::Outcome::Finished)
+        prompt.finish();
+}
+
+void ScreenView::takeLetter(const std::string& letter) {
+    if (letter == "/")
+        _prompt.emplace("Search: ", std::string(), [this](const std::string& text) {
+            if (!text.empty())
+                _query = text;
+            search(SearchDirection::Forward);
+        });
+    else if (letter == "f")
+        _prompt.emplace("Only rows with (empty for all): ", _filter, [this](const std::string& text) {
+            _filter = text;
+            _scroll = 0;
+        });
+    else if (letter == "n")
+        search(SearchDirection::Forward);
+    else if (letter == "N")
+        search(SearchDirection::Backward);
+    else if (letter == "]")
+        scrollTo(findBranch(shownRows(), _scroll, SearchDirection::Forward));
+    else if (letter == "[")
+        scrollTo(findBranch(shownRows(), _scroll, SearchDirection::Backward));
+}
+
+void ScreenView::search(SearchDirection direction) {
+    if (!_query.empty())
+        scrollTo(findRow(shownRows(), _query, _scroll, direction));
+}
+
+/// As far as it makes sense to scroll; a row that is on the last screen is shown there.
+void ScreenView::scrollTo(const std::optional<std::size_t>& row) {
+    if (row)
+        _scroll = std::min(*row, layout().maximumScroll());
 }
 
 void ScreenView::draw() {
+    if (_prompt) {
+        _terminal.draw(composeFrame(shownRows(), _prompt->line(), _terminal.size(), _scroll, _events));
+        return;
+    }
     std::string status = _note.empty() ? _status : _status + " " + _note;
     if (!_rows.empty() && !_advice.empty())
         status += "; " + _advice;

@@ -3,15 +3,19 @@
 
 #pragma once
 
+#include "Platform/Linux/LoopTimer.h"
 #include "Tools/LogOverride.h"
 #include "Tools/Output.h"
 #include "Tools/Terminal/KeyReader.h"
+#include "Tools/Terminal/Prompt.h"
 #include "Tools/Terminal/Terminal.h"
 #include "Tools/Text/TreeText.h"
+#include "Tools/Watch/RowSearch.h"
 #include "Tools/Watch/TerminalFrame.h"
 
 #include <functional>
 #include <memory>
+#include <optional>
 #include <string>
 #include <vector>
 
@@ -66,6 +70,12 @@ public:
 
 private:
     void handleInput(std::string_view bytes);
+    bool take(const std::vector<KeyPress>& presses);
+    void takeLetter(const std::string& letter);
+    void takeInPrompt(const KeyPress& press);
+    void search(SearchDirection direction);
+    void scrollTo(const std::optional<std::size_t>& row);
+    [[nodiscard]] ScreenLayout layout() const;
     [[nodiscard]] std::vector<TreeRow> shownRows() const;
     void draw();
 
@@ -74,6 +84,10 @@ private:
         _deferredLog; ///< declared before the terminal: its lines come after the screen is restored
     Terminal _terminal;
     KeyReader _keys;
+    LoopTimer _escape; ///< until an Escape is a key of its own
+    std::optional<Prompt> _prompt;
+    std::string _query;  ///< of the latest search
+    std::string _filter; ///< only rows with it are shown; empty for all
     std::string _status;
     std::string _note;
     std::string _advice;

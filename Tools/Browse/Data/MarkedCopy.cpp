@@ -10,11 +10,12 @@
 #include "Recording/Pcapng/PcapngReader.h"
 #include "Recording/Pcapng/PcapngWriter.h"
 #include "Recording/Pcapng/RecordingCopy.h"
-#include "Tools/OutputGuard.h"
 
 #include <cerrno>
+#include <filesystem>
 #include <memory>
 #include <span>
+#include <system_error>
 #include <vector>
 
 #include <fcntl.h>
@@ -87,8 +88,9 @@ Result<std::uint64_t> MarkedCopy::writeTo(int descriptor) const {
 }
 
 Result<std::uint64_t> MarkedCopy::write() const {
-    if (const std::string reason = whyNotWritten(input, output, false); !reason.empty())
-        return Failure{reason};
+    // The input is there, too.
+    if (std::error_code error; std::filesystem::exists(output, error))
+        return Failure{output + " is there already; nothing is overwritten"};
     Result<AtomicFile> file = AtomicFile::create(output, newFileMode);
     if (!file)
         return Failure{output + ": " + file.reason()};

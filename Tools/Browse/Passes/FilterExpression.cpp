@@ -28,11 +28,15 @@ FilterExpression::FilterExpression(Expression expression, const Catalogue& catal
       _paths(catalogue, _inputs), _picture(catalogue) {
     _readsPicture = std::any_of(_expression.inputs.begin(), _expression.inputs.end(),
                                 [](const RuleInput& input) { return !input.isPath(); });
+    _readsNeighbours = std::any_of(_expression.inputs.begin(), _expression.inputs.end(),
+                                   [](const RuleInput& input) { return input.isNeighbour(); });
     _wakeup.atNextMessage = true;
 }
 
 bool FilterExpression::wants(const CatalogueField& leaf) const {
-    return (_readsPicture && _picture.wants(leaf)) || _paths.reads(leaf);
+    // Lists of neighbours take most of the time where nothing reads them.
+    const bool isOfPicture = _readsPicture && (_readsNeighbours || !isNeighbour(leaf.role));
+    return (isOfPicture && _picture.wants(leaf)) || _paths.reads(leaf);
 }
 
 bool FilterExpression::isDue() const {

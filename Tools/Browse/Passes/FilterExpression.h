@@ -42,6 +42,7 @@ private:
     PathInputs _paths;
     RadioPicture _picture;
     bool _readsPicture = false;
+    bool _readsNeighbours = false;
     Wakeup _wakeup;
     std::optional<Time> _latest;
     bool _holds = false;

@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Tools/Browse/Prompt.h"
+#include "Tools/Terminal/Prompt.h"
 
 #include "Platform/PrintableText.h"
 
