@@ -46,6 +46,7 @@ endfunction()
 function(velmora_fortify_less)
     get_target_property(options velmora_options INTERFACE_COMPILE_OPTIONS)
     if("-D_FORTIFY_SOURCE=3" IN_LIST options)
-        set_source_files_properties(${ARGN} PROPERTIES COMPILE_OPTIONS "-U_FORTIFY_SOURCE;-D_FORTIFY_SOURCE=2")
+        set_source_files_properties(${ARGN} PROPERTIES COMPILE_OPTIONS "-U_FORTIFY_SOURCE;-D_FORTIFY_SOURCE=2"
+                                    SKIP_PRECOMPILE_HEADERS ON)
     endif()
 endfunction()

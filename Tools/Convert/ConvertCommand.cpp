@@ -70,7 +70,6 @@ Conversion conversionOf(const ConvertOptions& options, std::vector<Fix> position
     conversion.title = fileTitle(options.file);
     conversion.path = options.file;
     conversion.name = options.out;
-    conversion.temporary = output->path();
     conversion.technology = options.technology;
     if (!options.technology.empty())
         conversion.technologies = technologiesOf(options.file);
@@ -105,7 +104,8 @@ int runConvert(const ConvertOptions& options) {
         return ExitStatus::BadInput;
     }
     const bool converted = makeFile(file, *target, [&](AtomicFile& made, WorkContext& context) {
-        const Conversion conversion = conversionOf(options, *std::move(positions));
+        Conversion conversion = conversionOf(options, *std::move(positions));
+        conversion.temporary = made.path();
         return convertMessages(**reader, conversion, made.descriptor(), context);
     });
     const bool whole = reportLosses(**reader, fileTitle(options.file));
