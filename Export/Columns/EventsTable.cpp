@@ -100,7 +100,7 @@ EventsTable::EventsTable(std::string_view technology, std::string file, ByteSink
                          PageCompressor& compressor)
     : _table(layout(technology), std::move(file), sink, compressor) {}
 
-void EventsTable::add(const Event& event, const std::optional<Coordinates>& place) {
+void EventsTable::add(const Event& event, const std::optional<DecimalDegrees>& place) {
     _table.addRow();
     _table.setInteger(Column::time, event.time.time_since_epoch().count());
     if (event.end)

@@ -4,7 +4,7 @@
 #pragma once
 
 #include "Analysis/Events/Event.h"
-#include "Export/Columns/Coordinates.h"
+#include "Export/Columns/DecimalDegrees.h"
 #include "Export/Columns/InputTable.h"
 
 #include <optional>
@@ -20,7 +20,7 @@ public:
     EventsTable(std::string_view technology, std::string file, ByteSink& sink, PageCompressor& compressor);
 
     /// Adds a row. `place`: where the event happened or began.
-    void add(const Event& event, const std::optional<Coordinates>& place);
+    void add(const Event& event, const std::optional<DecimalDegrees>& place);
     [[nodiscard]] InputTable& table() { return _table; }
     [[nodiscard]] const InputTable& table() const { return _table; }
 

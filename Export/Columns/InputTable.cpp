@@ -3,7 +3,7 @@
 
 #include "Export/Columns/InputTable.h"
 
-#include "Export/Columns/Coordinates.h"
+#include "Export/Columns/DecimalDegrees.h"
 
 #include <utility>
 

@@ -3,7 +3,7 @@
 
 #include "Export/Columns/PositionsTable.h"
 
-#include "Export/Columns/Coordinates.h"
+#include "Export/Columns/DecimalDegrees.h"
 
 namespace velmora::positionsTable {
 
@@ -34,7 +34,7 @@ TableLayout layout(std::string_view technology) {
 }
 
 void add(InputTable& table, const Fix& fix) {
-    const Coordinates place = coordinatesOf(fix);
+    const DecimalDegrees place = decimalDegreesOf(fix);
     table.addRow();
     table.setInteger(Column::time, fix.time.time_since_epoch().count());
     table.setInteger(Column::latitude, place.latitude);

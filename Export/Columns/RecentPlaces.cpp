@@ -5,7 +5,7 @@
 
 namespace velmora {
 
-void RecentPlaces::add(Time time, const Coordinates& place) {
+void RecentPlaces::add(Time time, const DecimalDegrees& place) {
     if (_entries.size() < most)
         _entries.push_back({time, place});
     else
@@ -13,7 +13,7 @@ void RecentPlaces::add(Time time, const Coordinates& place) {
     _next = (_next + 1) % most;
 }
 
-std::optional<Coordinates> RecentPlaces::at(Time time) const {
+std::optional<DecimalDegrees> RecentPlaces::at(Time time) const {
     for (std::size_t i = 1; i <= _entries.size(); ++i)
         if (const Entry& entry = _entries[(_next + most - i) % most]; entry.time == time)
             return entry.place;

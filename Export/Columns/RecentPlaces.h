@@ -3,7 +3,7 @@
 
 #pragma once
 
-#include "Export/Columns/Coordinates.h"
+#include "Export/Columns/DecimalDegrees.h"
 #include "Platform/Clock.h"
 
 #include <cstddef>
@@ -18,14 +18,14 @@ class RecentPlaces {
 public:
     static constexpr std::size_t most = 4096;
 
-    void add(Time time, const Coordinates& place);
+    void add(Time time, const DecimalDegrees& place);
     /// The place of the latest message of that time; absent where there is none.
-    [[nodiscard]] std::optional<Coordinates> at(Time time) const;
+    [[nodiscard]] std::optional<DecimalDegrees> at(Time time) const;
 
 private:
     struct Entry {
         Time time{};
-        Coordinates place;
+        DecimalDegrees place;
     };
 
     std::vector<Entry> _entries; ///< a ring once it is full

@@ -3,7 +3,7 @@
 
 #pragma once
 
-#include "Export/Columns/Coordinates.h"
+#include "Export/Columns/DecimalDegrees.h"
 #include "Export/Columns/Parquet/ParquetWriter.h"
 #include "Export/Columns/TableLayout.h"
 
@@ -20,7 +20,7 @@ struct RowContext {
     std::int64_t time = 0;                      ///< in nanoseconds since 1970
     std::optional<std::int64_t> modemTime = {}; ///< the same
     std::optional<std::uint32_t> code = {};
-    std::optional<Coordinates> place = {};
+    std::optional<DecimalDegrees> place = {};
 };
 
 /// Writes the rows of one table of an input.

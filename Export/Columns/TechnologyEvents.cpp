@@ -12,7 +12,7 @@ TechnologyEvents::TechnologyEvents(const Catalogue& catalogue, const RuleSet& ru
 }
 
 void TechnologyEvents::report(const ObservedMessage& message, std::uint64_t number,
-                              const std::optional<Coordinates>& place) {
+                              const std::optional<DecimalDegrees>& place) {
     if (place)
         _places.add(message.arrival, *place);
     _engine.report({{0, number}, message.arrival, message});
@@ -24,7 +24,7 @@ Result<Done> TechnologyEvents::finish() {
 }
 
 void TechnologyEvents::began(const Event& event) {
-    if (const std::optional<Coordinates> place = _places.at(event.time))
+    if (const std::optional<DecimalDegrees> place = _places.at(event.time))
         _begun[{event.time, event.kind}] = *place;
 }
 

@@ -28,7 +28,7 @@ public:
 
     /// The next message: its number in the input, and where it arrived.
     void report(const ObservedMessage& message, std::uint64_t number,
-                const std::optional<Coordinates>& place);
+                const std::optional<DecimalDegrees>& place);
     /// As EventEngine has them.
     void noted(std::uint64_t message, std::string_view text) { _engine.noted({0, message}, text); }
     void damaged(std::uint64_t message, std::string_view reason) { _engine.damaged({0, message}, reason); }
@@ -46,7 +46,7 @@ private:
 
     EventsTable _table;
     RecentPlaces _places;
-    std::map<Key, Coordinates> _begun; ///< of what lasts: time and kind, and where it began
+    std::map<Key, DecimalDegrees> _begun; ///< of what lasts: time and kind, and where it began
     EventEngine _engine;
 };
 

@@ -63,7 +63,7 @@ RowContext TechnologyTables::contextOf(const ObservedMessage& message) const {
         if (const std::optional<Time> own = timeOfRecord(*message.timestamp))
             context.modemTime = own->time_since_epoch().count();
     if (_message.position)
-        context.place = coordinatesOf(_message.position->fix);
+        context.place = decimalDegreesOf(_message.position->fix);
     return context;
 }
 

@@ -15,7 +15,8 @@ namespace {
 class EventsTableTest : public testing::Test {
 protected:
     /// The least value of each column that has one, as it is stored: of a single row, the value.
-    std::map<std::string, std::string> row(const Event& event, const std::optional<Coordinates>& place = {}) {
+    std::map<std::string, std::string> row(const Event& event,
+                                           const std::optional<DecimalDegrees>& place = {}) {
         EventsTable table("Ostrel_LTE", "f00", _sink, _compressor);
         table.add(event, place);
         EXPECT_TRUE(table.table().finish());
@@ -44,7 +45,7 @@ TEST_F(EventsTableTest, hasWhatEveryEventHas) {
     event.severity = Severity::Critical;
     event.text = "no service";
     event.evidence = {{0, 7}, {0, 9}};
-    const auto values = row(event, Coordinates{-335006519, 1799991637});
+    const auto values = row(event, DecimalDegrees{-335006519, 1799991637});
     EXPECT_EQ(values, (std::map<std::string, std::string>{{"file", "f00"},
                                                           {"time", integer(1000)},
                                                           {"end_time", integer(3000)},

@@ -44,7 +44,7 @@ TEST_F(TableWriterTest, namesTheInputInEachRow) {
 
 TEST_F(TableWriterTest, hasNoValueForWhatAMessageLacks) {
     TableWriter table(_layout, "f00", _sink, _compressor);
-    table.addRow({1, 10, 20, 0x5137, Coordinates{481234567, -115000000}}, std::array<std::uint32_t, 1>{3},
+    table.addRow({1, 10, 20, 0x5137, DecimalDegrees{481234567, -115000000}}, std::array<std::uint32_t, 1>{3},
                  "62");
     table.addRow({2, 10});
     ASSERT_TRUE(table.finish());

@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Export/Columns/Coordinates.h"
+#include "Export/Columns/DecimalDegrees.h"
 
 #include "Export/Columns/Parquet/ColumnSchema.h"
 
@@ -9,7 +9,7 @@
 
 namespace velmora {
 
-Coordinates coordinatesOf(const Fix& fix) {
+DecimalDegrees decimalDegreesOf(const Fix& fix) {
     const double unit = std::pow(10.0, degreePlaces);
     return {std::llround(fix.latitude * unit), std::llround(fix.longitude * unit)};
 }

@@ -1,27 +1,27 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Export/Columns/Coordinates.h"
+#include "Export/Columns/DecimalDegrees.h"
 
 #include <gtest/gtest.h>
 
 namespace velmora {
 namespace {
 
-TEST(Coordinates, areDegreesWithSevenDecimals) {
+TEST(DecimalDegrees, areDegreesWithSevenDecimals) {
     Fix fix;
     fix.latitude = 48.12345674;
     fix.longitude = -11.50000006;
-    EXPECT_EQ(coordinatesOf(fix).latitude, 481234567);
-    EXPECT_EQ(coordinatesOf(fix).longitude, -115000001);
+    EXPECT_EQ(decimalDegreesOf(fix).latitude, 481234567);
+    EXPECT_EQ(decimalDegreesOf(fix).longitude, -115000001);
 }
 
-TEST(Coordinates, holdTheEndsOfTheEarth) {
+TEST(DecimalDegrees, holdTheEndsOfTheEarth) {
     Fix fix;
     fix.latitude = -90;
     fix.longitude = -180;
-    EXPECT_EQ(coordinatesOf(fix).latitude, -900000000);
-    EXPECT_EQ(coordinatesOf(fix).longitude, -1800000000);
+    EXPECT_EQ(decimalDegreesOf(fix).latitude, -900000000);
+    EXPECT_EQ(decimalDegreesOf(fix).longitude, -1800000000);
 }
 
 TEST(Rounded, isTheDoubleOfTheDecimalNumber) {
