@@ -3,15 +3,14 @@
 
 #include "App/Playback/PlaybackController.h"
 
-#include "App/DateFormatter.h"
 #include "App/Playback/MomentText.h"
 #include "App/Playback/PlaybackNotice.h"
 #include "App/Playback/PlaybackSpeeds.h"
+#include "App/Playback/ShownPosition.h"
 #include "App/Playback/TimedSteps.h"
 #include "Platform/PrintableText.h"
 #include "Platform/TelephonyService.h"
 
-#include <algorithm>
 #include <chrono>
 #include <cmath>
 #include <limits>
@@ -53,8 +52,7 @@ PlaybackController::PlaybackController(const ModelPlatform& platform, std::strin
       _bar(playbackSpeedTitles()),
       _drive(_platform.clock, _host.rules,
              {[this](Time time) { seekToTime(time + 1ns); }, [this] { static_cast<void>(reopen()); },
-              [this] { return progress(); }}),
-      _speed(normalPlaybackSpeed) {
+              [this] { return progress(); }}) {
     PlaybackBar::Actions actions;
     actions.command = [this](PlaybackBar::Command command) { run(command); };
     actions.seek = [this](double part) {
@@ -143,15 +141,12 @@ void PlaybackController::pause() {
 
 void PlaybackController::playOn() {
     const Time now = _platform.clock.now();
-    const double elapsed = static_cast<double>((now - _playedSince).count()) * playbackSpeeds[_speed].factor;
-    const Time target = _playedFrom + std::chrono::nanoseconds(std::llround(elapsed));
+    const Time target = _pace.dueAt(now);
     const std::uint64_t before = _player->position();
     const bool isThere = inTime([&] { return _player->playTo(target, messagesAtOnce); });
     // A drive that is played faster than it can be decoded is played as fast as it can.
-    if (!isThere || (!_player->next() && !_index->isComplete())) {
-        _playedFrom = shownTime();
-        _playedSince = now;
-    }
+    if (!isThere || (!_player->next() && !_index->isComplete()))
+        _pace.beginAt(shownTime(), now);
     if (!_player->next() && _index->isComplete())
         _playing.reset();
     if (_player->position() == before) {
@@ -168,8 +163,7 @@ void PlaybackController::playOn() {
 void PlaybackController::moved() {
     if (!std::exchange(_event, {}).empty())
         _host.noticeChanged();
-    _playedFrom = shownTime();
-    _playedSince = _platform.clock.now();
+    _pace.beginAt(shownTime(), _platform.clock.now());
     checkFile();
     _tree.clear();
     _drive.changed();
@@ -231,25 +225,18 @@ void PlaybackController::seekToEvent(const Event* event) {
 }
 
 void PlaybackController::setSpeed(std::size_t index) {
-    _speed = index;
+    _pace.setSpeed(index);
     moved();
 }
 
 Time PlaybackController::shownTime() const {
-    return _player->now().value_or(_index->first().value_or(Time()));
+    return velmora::shownTime(*_index, *_player);
 }
 
 void PlaybackController::showBar() {
-    PlaybackBar::Shown shown;
+    PlaybackBar::Shown shown = shownPosition(*_index, *_player, _platform.clock);
     shown.isPlaying = isPlaying();
-    shown.speed = _speed;
-    if (const std::optional<Time> first = _index->first()) {
-        const auto whole = static_cast<double>((*_index->last() - *first).count());
-        const auto before = static_cast<double>((shownTime() - *first).count());
-        const bool isAtEnd = _player->position() == _index->messages();
-        shown.part = whole > 0 ? std::clamp(before / whole, 0.0, 1.0) : isAtEnd ? 1 : 0;
-        shown.time = DateFormatter(_platform.clock, "yyyy-MM-dd HH:mm:ss").stringFromDate(shownTime());
-    }
+    shown.speed = _pace.speed();
     _bar.show(shown);
 }
 

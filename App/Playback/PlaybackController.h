@@ -4,6 +4,7 @@
 #pragma once
 
 #include "App/Playback/MomentTree.h"
+#include "App/Playback/PlaybackPace.h"
 #include "App/Playback/PlayedDrive.h"
 #include "Model/VelmoraModel.h"
 #include "Model/VelmoraModelNode.h"
@@ -95,9 +96,7 @@ private:
     PlayedDrive _drive;              ///< of the index and the player
     std::unique_ptr<Timer> _reading; ///< while the index is not complete
     std::unique_ptr<Timer> _playing; ///< while it plays
-    std::size_t _speed;
-    Time _playedFrom{};                   ///< in the recording ...
-    Time _playedSince{};                  ///< ... at this time of the platform's clock
+    PlaybackPace _pace;
     std::optional<std::uint64_t> _wanted; ///< where to go once the index has read that far
     std::string _change;                  ///< of the file since it was opened
     std::string _event;                   ///< that the moment was chosen by

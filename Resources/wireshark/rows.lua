@@ -31,7 +31,8 @@ local makers = {
     end,
     e = function(name, label, number)
         local texts = enumerations[number]
-        return ProtoField.uint32(name, label, base.DEC, next(texts) and texts or nil)
+        local make = texts[-1] and ProtoField.int32 or ProtoField.uint32
+        return make(name, label, base.DEC, next(texts) and texts or nil)
     end,
     f = function(name, label, set, clear)
         return ProtoField.bool(name, label, base.NONE, {set, clear})
@@ -150,6 +151,7 @@ local function prepare(view)
                     row.read, row.size = readerOf(row)
                 end
                 row.mean = meaningOf(row)
+                row.type = row.f[1] and valueTables[row.f[1]][3]
                 -- Of most rows, which need no more than their number and one field.
                 row.only = row.k ~= "-" and row.k ~= "t" and #row.fields == 1 and row.fields[1] or nil
                 view.rows[row.l] = view.rows[row.l] or row

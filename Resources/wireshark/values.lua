@@ -136,9 +136,23 @@ local listForms = {
     end,
 }
 
+-- In a function of its own, since one cannot have more than 200 local variables.
+local addModemView = (function()
+@PART modem.lua@
+
+@PART cells.lua@
+
+return addModemView
+end)()
+
 -- Adds what a section shows of a record; `list`: its property list, where it is one.
-local function addView(tree, view, record, list)
-    if record.code >= extraCodes then
+local function addView(tree, view, record, list, technology)
+    if technology == "Modem" then
+        -- Without the interface's name, what all messages of a live modem hold tells that it is one.
+        if record.technology == technology or (list and list.kind == "dictionary" and list.value.kVoxModemPresence) then
+            addModemView(tree, view, record, list)
+        end
+    elseif record.code >= extraCodes then
         local form = listForms[record.code]
         if list and form and not form(tree, view, list) then
             damaged(record, experts.badList, "Property list cannot be read: a root of kind " .. list.kind)
@@ -175,7 +189,7 @@ end
 local function addViews(record, list)
     for _, technology in ipairs(technologiesOf(record.technology)) do
         for _, view in ipairs(views[technology][record.code] or {}) do
-            addView(record.branches[view.section] or record.tree, view, record, list)
+            addView(record.branches[view.section] or record.tree, view, record, list, technology)
         end
     end
 end

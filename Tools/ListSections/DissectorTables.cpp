@@ -131,10 +131,6 @@ DissectorTables::DissectorTables(Resources& templates) {
             _paths += pathsOf(technology, decoder->catalogue(), _fields);
             continue;
         }
-        if (constant == kVoxLogChannelTechnology_Modem) {
-            _views += "    Modem={},\n"; // its messages are property lists, which are shown as such
-            continue;
-        }
         _views += "    " + std::string(technology) + "={\n" +
                   (sections ? writer.sections(sections->classIndex()) : writer.parsers()) + "    },\n";
     }

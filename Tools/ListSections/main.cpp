@@ -6,6 +6,7 @@
 #include "Platform/PrintableText.h"
 #include "Platform/UTF8.h"
 #include "Tools/ListSections/DissectorTables.h"
+#include "Tools/ListSections/ModemTables.h"
 #include "Tools/ListSections/TechnologyTable.h"
 
 #include <cstdio>
@@ -142,6 +143,7 @@ public:
         _tables["@CHARACTERS@"] = dissectorCharacters();
         _tables["@VIEWS@"] = _dissected.views();
         _tables["@PATHS@"] = _dissected.paths();
+        _tables["@MODEM@"] = modemTables();
         std::ostringstream fields;
         _dissected.fields().writeFields(fields);
         _tables["@FIELDS@"] = fields.str();
