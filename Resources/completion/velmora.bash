@@ -267,7 +267,8 @@ _velmora_log() {
     case $command:$files in
     rules:0) _velmora_offer check test ;;
     rules:*) _filedir toml ;;
-    decode:* | browse:* | info:* | events:* | stats:* | report:* | columns:* | record:0 | convert:[01] | diff:[01] | mask:[01])
+    convert:1) _filedir '@(pcapng|velmora|dlf|sqlite|gpx|geojson|kml)' ;;
+    decode:* | browse:* | info:* | events:* | stats:* | report:* | columns:* | record:0 | convert:0 | diff:[01] | mask:[01])
         _filedir '@(pcapng|velmora|dlf)'
         ;;
     esac

@@ -109,12 +109,17 @@ end
 
 -- The text of an ASCII or a UTF-16 string. Wireshark's own conversion gives as many bytes as the range has, which
 -- is too few or too many where the text has another length.
-local function textOfASCII(range)
+-- What is no character is replaced, and is the list's `flaw`: the decoder refuses all of it.
+local function textOfASCII(range, list)
     local text = range:raw()
-    return text:find("[\x80-\xFF]") and text:gsub("[\x80-\xFF]", replacement) or text
+    if not text:find("[\x80-\xFF]") then
+        return text
+    end
+    list.flaw = list.flaw or "an ASCII string has other bytes"
+    return (text:gsub("[\x80-\xFF]", replacement))
 end
 
-local function textOfUTF16(range)
+local function textOfUTF16(range, list)
     local bytes = range:raw()
     local out = {}
     local at = 1
@@ -131,6 +136,9 @@ local function textOfUTF16(range)
                 character = 0x10000 + (character - 0xD800) * 1024 + low - 0xDC00
                 at = at + 2
             end
+        end
+        if character >= 0xD800 and character <= 0xDFFF then
+            list.flaw = list.flaw or "a UTF-16 string has half a surrogate pair"
         end
         out[#out + 1] = utf8Of(character)
     end
@@ -173,11 +181,11 @@ local function scalarText(list, kind, count, content, offset)
         return text, range, "data", text
     elseif kind == 5 then
         local range = list.window(content, count)
-        local text = count > 0 and textOfASCII(range) or ""
+        local text = count > 0 and textOfASCII(range, list) or ""
         return text, range, "text", text
     elseif kind == 6 then
         local range = list.window(content, count * 2)
-        local text = count > 0 and textOfUTF16(range) or ""
+        local text = count > 0 and textOfUTF16(range, list) or ""
         return text, range, "text", text
     end
     refuse(string.format("object of unknown kind 0x%x%x at %d", kind, count, offset))

@@ -16,7 +16,11 @@ local function addList(range, pinfo, tree)
             return xmlList(range)
         end
         local list = binaryList(range)
-        return addObject(list, branch, list.top, nil, 1)
+        local value = addObject(list, branch, list.top, nil, 1)
+        if list.flaw then
+            refuse(list.flaw)
+        end
+        return value
     end)
     if fine then
         return result

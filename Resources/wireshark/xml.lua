@@ -17,11 +17,17 @@ local function unescaped(text)
     end))
 end
 
+-- Numbers that are not finite.
+local specialReals = {}
+for name, number in pairs({nan = 0 / 0, inf = math.huge, infinity = math.huge}) do
+    specialReals[name], specialReals["+" .. name], specialReals["-" .. name] = number, number, -number
+end
+
 -- What each element that is no array and no dictionary holds.
 local xmlScalars = {
     string = function(text) return "text", unescaped(text) end,
     integer = function(text) return "integer", tonumber(text) or refuse("no integer") end,
-    real = function(text) return "real", tonumber(text) or refuse("no real number") end,
+    real = function(text) return "real", tonumber(text) or specialReals[text:lower()] or refuse("no real number") end,
     date = function(text) return "date", text end,
     data = function(text) return "data", text end,
     ["true"] = function() return "flag", true end,

@@ -257,6 +257,16 @@ TEST_F(Completion, offersThePathsThatTheProgramLists) {
     ::setenv("PATH", path.c_str(), 1);
 }
 
+TEST_F(Completion, offersAllFormsThatConvertWrites) {
+    const TemporaryDirectory directory;
+    for (const char* name : {"new.dlf", "new.geojson", "new.gpx", "new.kml", "new.sqlite", "new.txt"})
+        std::ofstream(directory / name) << name;
+    const std::string start = directory / "new.";
+    EXPECT_EQ(offered("velmora-log convert a.dlf " + start),
+              (Words{start + "dlf", start + "geojson", start + "gpx", start + "kml", start + "sqlite"}));
+    EXPECT_EQ(offered("velmora-log convert " + start), Words{start + "dlf"}) << "these can be read";
+}
+
 TEST_F(Completion, offersFiles) {
     const std::string folder = VELMORA_SOURCE_DIR "/Tests/Recordings/";
     const Words gsm = {folder + "gsm.pcapng"};
