@@ -27,7 +27,8 @@ DRAWN = """return [...document.querySelectorAll('#stage canvas')].filter((canvas
         drawn += isDrawn ? 1 : 0;
     }
     return drawn / (width - left); });"""
-LENGTH = "return Number(document.getElementById('stage')?.dataset.length)"  # of what the charts show, in ms
+# Of what the charts show, in ms; 0 while the page builds them anew.
+LENGTH = "return Number(document.getElementById('stage')?.dataset.length ?? 0)"
 GROUND = "return getComputedStyle(document.body).backgroundColor"
 VIOLATIONS = """
 return axe.run(document, { resultTypes: ['violations'] }).then((result) => result.violations.map((each) =>
