@@ -38,6 +38,20 @@ class Browser(ABC):
             self.wait_for_drawing()
         return found
 
+    def loads_page(self, action: Callable[[], object], ready: str) -> bool:
+        """Whether the action makes the page load again, up to where the script `ready` returns something."""
+        self.run("document.documentElement.dataset.isOldPage = true")
+        action()
+        until = time.monotonic() + LONGEST_WAIT_S
+        while time.monotonic() < until:
+            try:
+                if self.run("return document.documentElement?.dataset.isOldPage === undefined") and self.run(ready):
+                    return True
+            except RuntimeError:  # a page that is being replaced runs no scripts
+                pass
+            time.sleep(0.05)
+        return False
+
     @abstractmethod
     def resize(self, width: int, height: int) -> None: ...
 
