@@ -6,7 +6,7 @@
 #include "Toolkit/Navigation/ViewController.h"
 #include "Toolkit/View.h"
 #include "Toolkit/Widgets/Animation.h"
-#include "Toolkit/Widgets/SheetWidget.h"
+#include "Toolkit/Widgets/Navigation/SheetWidget.h"
 #include "Toolkit/Widgets/WindowWidget.h"
 
 #include <QPointer>

@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Toolkit/Widgets/WrappedLabel.h"
+#include "Toolkit/Widgets/Text/WrappedLabel.h"
 
 #include <QPainter>
 #include <QStyle>

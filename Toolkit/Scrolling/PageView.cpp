@@ -1,9 +1,9 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Toolkit/PageView.h"
+#include "Toolkit/Scrolling/PageView.h"
 
-#include "Toolkit/Widgets/PageWidget.h"
+#include "Toolkit/Widgets/Scrolling/PageWidget.h"
 
 #include <QScrollBar>
 

@@ -1,11 +1,11 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Toolkit/Widgets/ScrollWidget.h"
+#include "Toolkit/Widgets/Scrolling/ScrollWidget.h"
 
-#include "Toolkit/Widgets/ScrollSigns.h"
+#include "Toolkit/Widgets/Scrolling/ScrollSigns.h"
+#include "Toolkit/Widgets/Scrolling/TouchScroll.h"
 #include "Toolkit/Widgets/Tables/TableWidget.h"
-#include "Toolkit/Widgets/TouchScroll.h"
 
 #include <QScrollEvent>
 #include <QScrollPrepareEvent>

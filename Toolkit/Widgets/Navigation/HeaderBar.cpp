@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Toolkit/Widgets/HeaderBar.h"
+#include "Toolkit/Widgets/Navigation/HeaderBar.h"
 
 #include "Toolkit/Widgets/Conversions.h"
 

@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Toolkit/Widgets/ScrollSigns.h"
+#include "Toolkit/Widgets/Scrolling/ScrollSigns.h"
 
 #include "Toolkit/Widgets/Contrast.h"
 #include "Toolkit/Widgets/Tables/CellWidget.h"

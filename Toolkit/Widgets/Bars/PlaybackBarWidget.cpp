@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Toolkit/Widgets/PlaybackBarWidget.h"
+#include "Toolkit/Widgets/Bars/PlaybackBarWidget.h"
 
 #include "Toolkit/Widgets/Conversions.h"
 #include "Toolkit/Widgets/WindowWidget.h"

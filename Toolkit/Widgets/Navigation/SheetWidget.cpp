@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Toolkit/Widgets/SheetWidget.h"
+#include "Toolkit/Widgets/Navigation/SheetWidget.h"
 
 #include "Toolkit/Widgets/WindowWidget.h"
 

@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Toolkit/Widgets/NavigationView.h"
+#include "Toolkit/Widgets/Navigation/NavigationView.h"
 
 #include <QWidget>
 

@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Toolkit/Widgets/TouchScroll.h"
+#include "Toolkit/Widgets/Scrolling/TouchScroll.h"
 
 #include <QScroller>
 #include <QTouchEvent>

@@ -1,15 +1,15 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Toolkit/Widgets/Toolbar.h"
+#include "Toolkit/Widgets/Bars/Toolbar.h"
 
 #include "Toolkit/Bars/FlexibleSpace.h"
 #include "Toolkit/Bars/LabelItem.h"
 #include "Toolkit/Bars/SaveButton.h"
 #include "Toolkit/BusyIndicator.h"
 #include "Toolkit/Widgets/Conversions.h"
-#include "Toolkit/Widgets/LabelWidget.h"
 #include "Toolkit/Widgets/SpinnerWidget.h"
+#include "Toolkit/Widgets/Text/LabelWidget.h"
 
 #include <QHBoxLayout>
 #include <QPainter>

@@ -5,9 +5,9 @@
 
 #include "Toolkit/View.h"
 #include "Toolkit/Widgets/Animation.h"
-#include "Toolkit/Widgets/HeaderBar.h"
-#include "Toolkit/Widgets/NoticeBar.h"
-#include "Toolkit/Widgets/Toolbar.h"
+#include "Toolkit/Widgets/Bars/NoticeBar.h"
+#include "Toolkit/Widgets/Bars/Toolbar.h"
+#include "Toolkit/Widgets/Navigation/HeaderBar.h"
 
 #include <vector>
 

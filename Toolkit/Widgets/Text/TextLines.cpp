@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Toolkit/Widgets/TextLines.h"
+#include "Toolkit/Widgets/Text/TextLines.h"
 
 #include <QFontMetricsF>
 #include <QTextLayout>

@@ -1,11 +1,11 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Toolkit/Widgets/LabelWidget.h"
+#include "Toolkit/Widgets/Text/LabelWidget.h"
 
 #include "Toolkit/Widgets/Conversions.h"
 #include "Toolkit/Widgets/Tables/CellWidget.h"
-#include "Toolkit/Widgets/TextLines.h"
+#include "Toolkit/Widgets/Text/TextLines.h"
 
 #include <QFontMetricsF>
 #include <QPainter>

@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Toolkit/Widgets/ModalPresentation.h"
+#include "Toolkit/Widgets/Navigation/ModalPresentation.h"
 
 #include "Toolkit/Widgets/Conversions.h"
 

@@ -1,9 +1,9 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Toolkit/Widgets/PageWidget.h"
+#include "Toolkit/Widgets/Scrolling/PageWidget.h"
 
-#include "Toolkit/Widgets/TouchScroll.h"
+#include "Toolkit/Widgets/Scrolling/TouchScroll.h"
 
 #include <QApplication>
 #include <QKeyEvent>

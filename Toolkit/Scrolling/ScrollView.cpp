@@ -1,9 +1,9 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Toolkit/ScrollView.h"
+#include "Toolkit/Scrolling/ScrollView.h"
 
-#include "Toolkit/Widgets/ScrollWidget.h"
+#include "Toolkit/Widgets/Scrolling/ScrollWidget.h"
 
 namespace velmora {
 

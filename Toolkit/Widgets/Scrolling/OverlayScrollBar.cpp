@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Toolkit/Widgets/OverlayScrollBar.h"
+#include "Toolkit/Widgets/Scrolling/OverlayScrollBar.h"
 
 #include "Toolkit/Widgets/Contrast.h"
 

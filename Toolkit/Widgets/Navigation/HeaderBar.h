@@ -3,7 +3,7 @@
 
 #pragma once
 
-#include "Toolkit/Widgets/LabelWidget.h"
+#include "Toolkit/Widgets/Text/LabelWidget.h"
 
 #include <QAbstractButton>
 #include <QWidget>

@@ -1,11 +1,11 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Toolkit/Widgets/NoticeBar.h"
+#include "Toolkit/Widgets/Bars/NoticeBar.h"
 
 #include "Toolkit/Widgets/Accessibility.h"
 #include "Toolkit/Widgets/Conversions.h"
-#include "Toolkit/Widgets/WrappedLabel.h"
+#include "Toolkit/Widgets/Text/WrappedLabel.h"
 
 #include <QPainter>
 #include <QPushButton>
