@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Export/Masking/NumberPseudonyms.h"
+#include "Export/Masking/Pseudonyms/NumberPseudonyms.h"
 
 #include <array>
 

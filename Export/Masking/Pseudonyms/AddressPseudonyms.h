@@ -3,7 +3,7 @@
 
 #pragma once
 
-#include "Export/Masking/KeyedHash.h"
+#include "Export/Masking/Pseudonyms/KeyedHash.h"
 
 #include <array>
 #include <cstdint>

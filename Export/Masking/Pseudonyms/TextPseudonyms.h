@@ -3,9 +3,9 @@
 
 #pragma once
 
-#include "Export/Masking/AddressPseudonyms.h"
-#include "Export/Masking/DigitPseudonyms.h"
-#include "Export/Masking/NumberPseudonyms.h"
+#include "Export/Masking/Pseudonyms/AddressPseudonyms.h"
+#include "Export/Masking/Pseudonyms/DigitPseudonyms.h"
+#include "Export/Masking/Pseudonyms/NumberPseudonyms.h"
 
 #include <string>
 #include <string_view>

@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Export/Masking/KeyedHash.h"
+#include "Export/Masking/Pseudonyms/KeyedHash.h"
 
 #include <nettle/hmac.h>
 #include <nettle/sha2.h>

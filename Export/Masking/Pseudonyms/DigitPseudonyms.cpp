@@ -1,9 +1,9 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Export/Masking/DigitPseudonyms.h"
+#include "Export/Masking/Pseudonyms/DigitPseudonyms.h"
 
-#include "Export/Masking/NumberPseudonyms.h"
+#include "Export/Masking/Pseudonyms/NumberPseudonyms.h"
 
 #include <algorithm>
 #include <vector>

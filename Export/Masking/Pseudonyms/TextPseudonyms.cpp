@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Export/Masking/TextPseudonyms.h"
+#include "Export/Masking/Pseudonyms/TextPseudonyms.h"
 
 #include <algorithm>
 #include <vector>

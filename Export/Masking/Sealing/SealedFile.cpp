@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Export/Masking/SealedFile.h"
+#include "Export/Masking/Sealing/SealedFile.h"
 
 #include "Export/Masking/MaskKey.h"
 #include "Export/Masking/TechnologyName.h"

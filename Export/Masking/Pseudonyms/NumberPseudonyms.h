@@ -3,7 +3,7 @@
 
 #pragma once
 
-#include "Export/Masking/Permutation.h"
+#include "Export/Masking/Pseudonyms/Permutation.h"
 
 #include <cstdint>
 #include <unordered_map>

@@ -1,9 +1,9 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Export/Masking/PropertyListMask.h"
+#include "Export/Masking/PropertyLists/PropertyListMask.h"
 
-#include "Export/Masking/SIMFileBytes.h"
+#include "Export/Masking/PropertyLists/SIMFileBytes.h"
 #include "Platform/TelephonyService.h"
 #include "PropertyLists/PropertyListDate.h"
 

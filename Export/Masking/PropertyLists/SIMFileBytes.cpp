@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Export/Masking/SIMFileBytes.h"
+#include "Export/Masking/PropertyLists/SIMFileBytes.h"
 
 #include <string>
 

@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Export/Masking/PropertyKeys.h"
+#include "Export/Masking/PropertyLists/PropertyKeys.h"
 
 #include "LogMessages/LiveModem.h"
 #include "Platform/TelephonyService.h"

@@ -1,9 +1,9 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Export/Masking/AddressPseudonyms.h"
+#include "Export/Masking/Pseudonyms/AddressPseudonyms.h"
 
-#include "Export/Masking/Permutation.h"
+#include "Export/Masking/Pseudonyms/Permutation.h"
 
 #include <algorithm>
 #include <vector>

@@ -4,8 +4,8 @@
 #pragma once
 
 #include "Export/Masking/MaskReport.h"
-#include "Export/Masking/PropertyKeys.h"
-#include "Export/Masking/Pseudonyms.h"
+#include "Export/Masking/PropertyLists/PropertyKeys.h"
+#include "Export/Masking/Pseudonyms/Pseudonyms.h"
 #include "PropertyLists/Value.h"
 
 #include <chrono>

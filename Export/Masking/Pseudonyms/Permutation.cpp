@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Export/Masking/Permutation.h"
+#include "Export/Masking/Pseudonyms/Permutation.h"
 
 #include <vector>
 

@@ -3,12 +3,12 @@
 
 #pragma once
 
-#include "Export/Masking/AddressPseudonyms.h"
-#include "Export/Masking/DigitPseudonyms.h"
 #include "Export/Masking/MaskKey.h"
 #include "Export/Masking/MaskLevel.h"
-#include "Export/Masking/NumberPseudonyms.h"
-#include "Export/Masking/TextPseudonyms.h"
+#include "Export/Masking/Pseudonyms/AddressPseudonyms.h"
+#include "Export/Masking/Pseudonyms/DigitPseudonyms.h"
+#include "Export/Masking/Pseudonyms/NumberPseudonyms.h"
+#include "Export/Masking/Pseudonyms/TextPseudonyms.h"
 
 #include <chrono>
 #include <optional>

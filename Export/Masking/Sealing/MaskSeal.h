@@ -3,8 +3,8 @@
 
 #pragma once
 
-#include "Export/Masking/KeyedHash.h"
 #include "Export/Masking/MaskLevel.h"
+#include "Export/Masking/Pseudonyms/KeyedHash.h"
 #include "Platform/Bytes.h"
 
 #include <cstddef>
