@@ -2,10 +2,10 @@
 // SPDX-License-Identifier: MIT
 
 #include "Fuzz/CorpusTools.h"
-#include "Fuzz/DecoderSession.h"
+#include "Fuzz/Decoders/DecoderSession.h"
+#include "Fuzz/Decoders/MessageScript.h"
 #include "Fuzz/DriveMessages.h"
 #include "Fuzz/FuzzCorpora.h"
-#include "Fuzz/MessageScript.h"
 #include "Tests/Support/Hex.h"
 
 #include <set>

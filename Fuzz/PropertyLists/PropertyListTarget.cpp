@@ -2,7 +2,7 @@
 // SPDX-License-Identifier: MIT
 
 #include "Fuzz/FuzzTargets.h"
-#include "Fuzz/SameValue.h"
+#include "Fuzz/PropertyLists/SameValue.h"
 #include "PropertyLists/PropertyList.h"
 
 #include <string>

@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Fuzz/DecoderSession.h"
+#include "Fuzz/Decoders/DecoderSession.h"
 
 #include "LogGenerator/Extra/ExtraPayload.h"
 #include "LogGenerator/GSM/AssertionFailure.h"

@@ -4,7 +4,7 @@
 #include "Analysis/Rules/Evaluation/BoundExpression.h"
 #include "Analysis/Rules/Expression/ExpressionParser.h"
 #include "Fuzz/FuzzTargets.h"
-#include "Fuzz/RuleCatalogues.h"
+#include "Fuzz/Rules/RuleCatalogues.h"
 
 #include <chrono>
 #include <string>

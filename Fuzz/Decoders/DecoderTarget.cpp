@@ -1,9 +1,9 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Fuzz/DecoderSession.h"
+#include "Fuzz/Decoders/DecoderSession.h"
+#include "Fuzz/Decoders/MessageScript.h"
 #include "Fuzz/FuzzTargets.h"
-#include "Fuzz/MessageScript.h"
 #include "LogGenerator/OstrelLogGenerator.h"
 
 namespace velmora {

@@ -2,7 +2,7 @@
 // SPDX-License-Identifier: MIT
 
 #include "Fuzz/CorpusTools.h"
-#include "Fuzz/DecoderSession.h"
+#include "Fuzz/Decoders/DecoderSession.h"
 #include "Fuzz/DriveMessages.h"
 #include "Fuzz/FuzzCorpora.h"
 #include "LogMessages/LogMessage.h"

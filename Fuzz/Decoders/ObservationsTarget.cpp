@@ -1,9 +1,9 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
+#include "Fuzz/Decoders/FuzzedDecoders.h"
+#include "Fuzz/Decoders/MessageScript.h"
 #include "Fuzz/FuzzTargets.h"
-#include "Fuzz/FuzzedDecoders.h"
-#include "Fuzz/MessageScript.h"
 #include "Tests/LogGenerator/Observations/DisplayCheck.h"
 
 #include <optional>

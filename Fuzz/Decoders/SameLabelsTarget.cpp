@@ -1,10 +1,10 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Fuzz/DecoderSession.h"
+#include "Fuzz/Decoders/DecoderSession.h"
+#include "Fuzz/Decoders/MessageScript.h"
 #include "Fuzz/FuzzTargets.h"
-#include "Fuzz/MessageScript.h"
-#include "Fuzz/SameValue.h"
+#include "Fuzz/PropertyLists/SameValue.h"
 #include "LogMessages/LogMessage.h"
 
 #include <algorithm>

@@ -3,7 +3,7 @@
 
 #pragma once
 
-#include "Fuzz/DecoderSession.h"
+#include "Fuzz/Decoders/DecoderSession.h"
 
 #include <array>
 #include <cstdint>

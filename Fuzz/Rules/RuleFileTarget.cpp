@@ -5,7 +5,7 @@
 #include "Analysis/Rules/RuleSet.h"
 #include "Analysis/Rules/RuleTesting.h"
 #include "Fuzz/FuzzTargets.h"
-#include "Fuzz/RuleCatalogues.h"
+#include "Fuzz/Rules/RuleCatalogues.h"
 
 #include <algorithm>
 #include <string>

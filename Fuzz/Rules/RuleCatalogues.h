@@ -3,7 +3,7 @@
 
 #pragma once
 
-#include "Fuzz/DecoderSession.h"
+#include "Fuzz/Decoders/DecoderSession.h"
 #include "LogGenerator/LogGenerator.h"
 #include "Tests/Support/FakeClock.h"
 

@@ -2,9 +2,9 @@
 // SPDX-License-Identifier: MIT
 
 #include "Export/Report/DriveReport.h"
+#include "Fuzz/Decoders/FuzzedDecoders.h"
+#include "Fuzz/Decoders/MessageScript.h"
 #include "Fuzz/FuzzTargets.h"
-#include "Fuzz/FuzzedDecoders.h"
-#include "Fuzz/MessageScript.h"
 #include "Tests/Export/Report/PageCheck.h"
 
 #include <chrono>
