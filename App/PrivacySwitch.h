@@ -4,7 +4,7 @@
 #pragma once
 
 #include "Export/Masking/MaskKey.h"
-#include "Export/Masking/MaskSeal.h"
+#include "Export/Masking/Sealing/MaskSeal.h"
 #include "Platform/Bytes.h"
 #include "Platform/Clock.h"
 #include "Platform/Preferences.h"

@@ -4,7 +4,7 @@
 #pragma once
 
 #include "Toolkit/Label.h"
-#include "Toolkit/ScrollView.h"
+#include "Toolkit/Scrolling/ScrollView.h"
 #include "Toolkit/Tables/TableCell.h"
 
 #include <memory>

@@ -5,7 +5,7 @@
 
 #include "App/VelmoraApp.h"
 #include "App/VelmoraSaveView.h"
-#include "Export/Masking/SealedFile.h"
+#include "Export/Masking/Sealing/SealedFile.h"
 #include "Model/Snapshot.h"
 #include "Platform/SystemLog.h"
 #include "PropertyLists/PropertyList.h"

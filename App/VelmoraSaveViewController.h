@@ -3,7 +3,7 @@
 
 #pragma once
 
-#include "Export/Masking/MaskSeal.h"
+#include "Export/Masking/Sealing/MaskSeal.h"
 #include "Platform/Clock.h"
 #include "PropertyLists/Value.h"
 #include "Toolkit/Navigation/ViewController.h"

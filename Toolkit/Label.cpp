@@ -4,7 +4,7 @@
 #include "Toolkit/Label.h"
 
 #include "Toolkit/Widgets/Conversions.h"
-#include "Toolkit/Widgets/LabelWidget.h"
+#include "Toolkit/Widgets/Text/LabelWidget.h"
 
 namespace velmora {
 

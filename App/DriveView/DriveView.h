@@ -7,7 +7,7 @@
 #include "App/DriveView/DriveCharts.h"
 #include "App/DriveView/EventList.h"
 #include "App/DriveView/NowView.h"
-#include "Toolkit/PageView.h"
+#include "Toolkit/Scrolling/PageView.h"
 #include "Toolkit/Tables/GridView.h"
 
 #include <string>

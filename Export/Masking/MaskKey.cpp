@@ -3,7 +3,7 @@
 
 #include "Export/Masking/MaskKey.h"
 
-#include "Export/Masking/KeyedHash.h"
+#include "Export/Masking/Pseudonyms/KeyedHash.h"
 
 #include <cerrno>
 #include <system_error>

@@ -4,7 +4,7 @@
 #pragma once
 
 #include "Export/Masking/MaskReport.h"
-#include "Export/Masking/PropertyKeys.h"
+#include "Export/Masking/PropertyLists/PropertyKeys.h"
 #include "Platform/Bytes.h"
 
 #include <array>

@@ -3,7 +3,7 @@
 
 #pragma once
 
-#include "Export/Masking/MaskSeal.h"
+#include "Export/Masking/Sealing/MaskSeal.h"
 #include "Platform/Clock.h"
 #include "Platform/Result.h"
 #include "Recording/Files/OutputFile.h"

@@ -5,8 +5,8 @@
 
 #include "Export/Masking/MaskReport.h"
 #include "Export/Masking/MaskedPayloads.h"
-#include "Export/Masking/PropertyListMask.h"
-#include "Export/Masking/Pseudonyms.h"
+#include "Export/Masking/PropertyLists/PropertyListMask.h"
+#include "Export/Masking/Pseudonyms/Pseudonyms.h"
 #include "Export/Masking/RecordMask.h"
 #include "Export/Masking/TimeShift.h"
 #include "Platform/Bytes.h"

@@ -3,7 +3,7 @@
 
 #include "Export/Masking/RecordMask.h"
 
-#include "Export/Masking/SIMFileBytes.h"
+#include "Export/Masking/PropertyLists/SIMFileBytes.h"
 #include "LogGenerator/Observations/Catalogue.h"
 #include "LogMessages/LogMessage.h"
 #include "LogMessages/Record.h"

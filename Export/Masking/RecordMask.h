@@ -5,7 +5,7 @@
 
 #include "Export/Masking/KnownRegions.h"
 #include "Export/Masking/MaskReport.h"
-#include "Export/Masking/Pseudonyms.h"
+#include "Export/Masking/Pseudonyms/Pseudonyms.h"
 #include "LogGenerator/Fields/Meaning.h"
 
 #include <cstdint>

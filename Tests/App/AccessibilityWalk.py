@@ -20,7 +20,12 @@ import gi
 gi.require_version("Atspi", "2.0")
 from gi.repository import Atspi, GLib  # noqa: E402
 
-LIMIT_S = 20  # no step that works comes near it
+LIMIT_S = 40  # no step that works comes near it
+# The library waits less than a second for an answer by itself. A busy application takes longer, and a press whose answer
+# is late would be repeated.
+Atspi.set_timeout(10_000, 10_000)
+# What an object that has just gone leads to: its own calls fail, and others return None in its place.
+GONE = (GLib.Error, AttributeError)
 
 
 class Walk:
@@ -62,12 +67,24 @@ class Walk:
             GLib.MainContext.default().iteration(False)
             try:
                 found = condition()
-            except GLib.Error:  # an object that has just gone
+            except GONE:
                 found = None
             if found:
                 return found
             time.sleep(0.05)
         raise AssertionError("never seen: " + what + "\n" + self.picture())
+
+    def settled(self, look):
+        """What a look at the screen returns once all that it asserts holds: lists are loaded again while it looks."""
+        end = time.monotonic() + LIMIT_S
+        while True:
+            GLib.MainContext.default().iteration(False)
+            try:
+                return look()
+            except (AssertionError, *GONE) as error:
+                if time.monotonic() >= end:
+                    raise AssertionError(f"{error}\n{self.picture()}") from error
+            time.sleep(0.05)
 
     def objects(self):
         """Every object that is shown, with its role and name, top down."""
@@ -83,7 +100,10 @@ class Walk:
             waiting[:0] = [item.get_child_at_index(i) for i in range(item.get_child_count())]
 
     def picture(self):
-        return "\n".join(f"{role}: {name!r}" for _, role, name in self.objects())
+        try:
+            return "\n".join(f"{role}: {name!r}" for _, role, name in self.objects())
+        except GONE as error:
+            return f"(no picture of the screen: {error})"
 
     def find(self, role, start=""):
         """The last object shown of the role whose name begins so: what is on top comes last."""
@@ -102,16 +122,16 @@ class Walk:
         self.wait(f"the notice {sentence!r}", lambda: any(role == "alert" and sentence in text for _, role, text in self.objects()))
 
     def press(self, role, name):
-        assert self.see(role, name).do_action(0), f"{role} {name!r} cannot be pressed"
+        self.wait(f"{role} {name!r} pressed", lambda: self.find(role, name).do_action(0))
 
     def run(self):
         self.start_service()
         self.start_application()
 
         self.see("label", "Updated ")
-        assert self.find("animation") is None, "the indicator spins while connected"
-        assert self.see("frame").get_name() == "Velmora", "the window has another name"
-        assert self.find("tool bar", "Status"), "the bar with the status has no role"
+        self.wait("the indicator still while connected", lambda: self.find("animation") is None)
+        self.wait("the window's name", lambda: self.find("frame").get_name() == "Velmora")
+        self.see("tool bar", "Status")
         opened = self.walk_panes()
         assert opened >= 5, f"only {opened} panes seen"
 
@@ -120,9 +140,9 @@ class Walk:
         self.see("heading", "Registration")
         self.press("list item", "Serving PLMN")
         self.see("heading", "Serving PLMN")
-        row = self.see("list item", "Mobile Country Code").get_name()
         # One record has it with zeros, another without.
-        assert row in ("Mobile Country Code, 001", "Mobile Country Code, 1"), f"the row's value is not heard: {row!r}"
+        heard = ("Mobile Country Code, 001", "Mobile Country Code, 1")
+        self.wait("the row's value", lambda: self.find("list item", "Mobile Country Code").get_name() in heard)
         self.press("push button", "Back")
         self.see("heading", "Registration")
         self.press("push button", "Back")
@@ -133,7 +153,7 @@ class Walk:
         # A snapshot.
         self.press("push button", "Save")
         self.see("list item", "DLF binary (")
-        self.check_save_screen()
+        self.settled(self.check_save_screen)
         self.press("push button", "Save")
         self.wait("a snapshot", lambda: os.listdir(self.snapshots))
         self.see("alert", "Saved VelmoraSnapshot-")
@@ -151,7 +171,7 @@ class Walk:
         self.start_service()
         self.see("label", "Updated ")
         self.wait("the indicator hidden", lambda: self.find("animation") is None)
-        assert self.see("alert").get_name().startswith("Saved "), "a notice although all is well"
+        self.wait("no other notice", lambda: self.find("alert").get_name().startswith("Saved "))
 
         self.start_anew()
 
@@ -168,8 +188,10 @@ class Walk:
         return [rows.get_child_at_index(i) for i in range(rows.get_child_count())]
 
     def check_rows(self, name):
-        """Every row of the list has a role, a name, its place in the order and on the screen. Returns those that open."""
-        rows = self.wait(f"rows in {name!r}", lambda: self.rows(name))
+        """Every row of the list has a role, a name, its place in the order and on the screen. Returns those that open. To be
+        called by `settled`."""
+        rows = self.rows(name)
+        assert rows, f"no rows in {name!r}"
         top = None
         opening = []
         for index, row in enumerate(rows):
@@ -190,17 +212,21 @@ class Walk:
                 opening.append(row.get_name())
         return opening
 
+    def open_row(self, name, row):
+        """Presses a row of the list, which may be below the edge of the screen. False where the drive has moved on and the list
+        does not have it any more. To be called by `settled`."""
+        found = [item for item in self.rows(name) if item.get_name() == row]
+        assert not found or found[0].do_action(0), f"{row!r} cannot be pressed"
+        return bool(found)
+
     def walk_panes(self, name="Velmora", depth=0):
         """Opens whatever opens, and goes back each time; of the panes below the first ones, the first row that does. Returns
         how many panes were seen."""
         seen = 1
-        opening = self.check_rows(name)
+        opening = self.settled(lambda: self.check_rows(name))
         for row in opening if depth == 0 else opening[:1]:
-            # It may be below the edge of the screen.
-            item = [item for item in self.rows(name) if item.get_name() == row]
-            if not item:  # the drive has moved on
+            if not self.settled(lambda row=row: self.open_row(name, row)):
                 continue
-            assert item[0].do_action(0), f"{row!r} cannot be pressed"
             self.see_pane(row)
             seen += self.walk_panes(row, depth + 1)
             self.press("push button", "Back")
@@ -208,7 +234,8 @@ class Walk:
         return seen
 
     def check_save_screen(self):
-        """The dialog: its name, the field that has the keyboard, the button that Enter presses, and rows that are checked."""
+        """The dialog: its name, the field that has the keyboard, the button that Enter presses, and rows that are checked. To be
+        called by `settled`."""
         dialog = self.see("dialog", "Save Snapshot")
         assert dialog.get_state_set().contains(Atspi.StateType.MODAL), "the dialog is not modal"
         self.see("heading", "Save Snapshot")
@@ -227,9 +254,16 @@ class Walk:
         self.environment["LC_ALL"] = "ar_EG.UTF-8"
         self.start_application()
         self.see("label", "Updated ")
-        pane = self.check_rows("Velmora")[0]
+        pane = self.settled(lambda: self.check_rows("Velmora"))[0]
         self.press("list item", pane)
         self.see("heading", pane)
+        self.settled(lambda: self.check_mirrored_pane(pane))
+        self.application.terminate()
+        assert self.application.wait(LIMIT_S) == 0, "the application did not end well"
+        self.application = None
+
+    def check_mirrored_pane(self, pane):
+        """To be called by `settled`: bars and titles move while a pane comes up."""
         left = {
             role: self.see(role, name).get_extents(Atspi.CoordType.SCREEN).x
             for role, name in (("push button", "Back"), ("heading", pane), ("label", "Updated "))
@@ -237,26 +271,15 @@ class Walk:
         save = self.see("push button", "Save").get_extents(Atspi.CoordType.SCREEN).x
         assert left["push button"] > left["heading"], left
         assert left["label"] > save, (left, save)
-        self.application.terminate()
-        assert self.application.wait(LIMIT_S) == 0, "the application did not end well"
-        self.application = None
 
     def walk_drive(self):
         """The drive view: what is heard of the serving cell, the tables, the charts, and the way back."""
         self.press("push button", "Drive")
         self.see("heading", "Drive")
-        level = self.see("label", "Level, dBm, \u2212").get_name()
-        assert " s ago" in level, f"the level's age is not heard: {level!r}"
-        assert any(word in level for word in ("poor", "fair", "good", "excellent")), level
+        self.settled(self.check_level)
         self.see("label", "PLMN, 001-01")
         self.see("label", "Latest event, ")
-        neighbours = self.see("table", "Neighbours")
-        self.wait("rows of neighbours", lambda: neighbours.get_table_iface().get_n_rows() > 0)
-        table = neighbours.get_table_iface()
-        heads = [table.get_column_description(i) for i in range(table.get_n_columns())]
-        assert heads[2:] == ["Level, dBm", "Quality, dB", "\u0394 dB"], heads
-        spoken = table.get_accessible_at(0, 2).get_name()
-        assert spoken.startswith("\u2212") and " dBm" in spoken, f"a level is heard as {spoken!r}"
+        self.settled(self.check_neighbours)
         events = self.wait("the events", lambda: self.find_any("table", "Events"))
         self.wait("events", lambda: events.get_table_iface().get_n_rows() > 0)
         # A severity that is not listed is a button that is not checked.
@@ -265,10 +288,26 @@ class Walk:
         info.do_action(0)
         self.wait("the filter off", lambda: not info.get_state_set().contains(Atspi.StateType.CHECKED))
         info.do_action(0)
+        self.wait("the filter on", lambda: info.get_state_set().contains(Atspi.StateType.CHECKED))
         self.wait("the charts", lambda: self.find_any("", "Over time"))
         self.press("push button", "Back to Velmora")
         self.see("heading", "Velmora")
         self.wait("the drive view closed", lambda: self.find("table", "Neighbours") is None)
+
+    def check_level(self):
+        """To be called by `settled`."""
+        level = self.see("label", "Level, dBm, \u2212").get_name()
+        assert " s ago" in level, f"the level's age is not heard: {level!r}"
+        assert any(word in level for word in ("poor", "fair", "good", "excellent")), level
+
+    def check_neighbours(self):
+        """To be called by `settled`: neighbours come and go."""
+        table = self.see("table", "Neighbours").get_table_iface()
+        assert table.get_n_rows() > 0, "no rows of neighbours"
+        heads = [table.get_column_description(i) for i in range(table.get_n_columns())]
+        assert heads[2:] == ["Level, dBm", "Quality, dB", "\u0394 dB"], heads
+        spoken = table.get_accessible_at(0, 2).get_name()
+        assert spoken.startswith("\u2212") and " dBm" in spoken, f"a level is heard as {spoken!r}"
 
     def find_any(self, role, start):
         """As find, but of all objects, shown or further down the page; any role for an empty one."""
@@ -298,7 +337,7 @@ class Walk:
         self.press("push button", "Save")
         self.see("list item", "Idle Mode Neighbors")
         self.see("label", "Updated ")
-        assert self.find("alert") is None, "the notice outlives its cause"
+        self.wait("no notice, whose cause is gone", lambda: self.find("alert") is None)
         assert len(os.listdir(self.snapshots)) == saved + 1, "no snapshot from before"
         arguments = open(f"/proc/{self.application.pid}/cmdline", "rb").read().split(b"\0")[1:-1]
         assert arguments == [b"--log", b"stderr", b"--log-level", b"3"], arguments

@@ -7,7 +7,7 @@
 #include "App/DriveView/DriveScreen.h"
 #include "App/VelmoraSaveView.h"
 #include "Tests/App/SaveScreenFixture.h"
-#include "Toolkit/Widgets/LabelWidget.h"
+#include "Toolkit/Widgets/Text/LabelWidget.h"
 
 #include <QApplication>
 #include <QDir>

@@ -2,7 +2,7 @@
 // SPDX-License-Identifier: MIT
 
 #include "App/PrivacySwitch.h"
-#include "Export/Masking/SealedFile.h"
+#include "Export/Masking/Sealing/SealedFile.h"
 #include "Recording/Files/FileSource.h"
 #include "Tests/App/SaveScreenFixture.h"
 

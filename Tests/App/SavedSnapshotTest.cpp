@@ -3,7 +3,7 @@
 
 #include "App/VelmoraSaveView.h"
 #include "Tests/App/SaveScreenFixture.h"
-#include "Toolkit/Widgets/LabelWidget.h"
+#include "Toolkit/Widgets/Text/LabelWidget.h"
 
 #include <QDesktopServices>
 #include <QPushButton>

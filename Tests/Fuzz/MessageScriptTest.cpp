@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Fuzz/MessageScript.h"
+#include "Fuzz/Decoders/MessageScript.h"
 
 #include "Tests/Support/Hex.h"
 

@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Fuzz/SameValue.h"
+#include "Fuzz/PropertyLists/SameValue.h"
 #include "LogGenerator/Extra/ExtraPayload.h"
 #include "LogGenerator/GSM/AssertionFailure.h"
 #include "Tests/LogGenerator/Observations/DecodedTechnology.h"

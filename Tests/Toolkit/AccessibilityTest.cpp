@@ -6,7 +6,7 @@
 #include "Toolkit/Bars/LabelItem.h"
 #include "Toolkit/Bars/SaveButton.h"
 #include "Toolkit/BusyIndicator.h"
-#include "Toolkit/ScrollView.h"
+#include "Toolkit/Scrolling/ScrollView.h"
 #include "Toolkit/TextField.h"
 #include "Toolkit/Widgets/Accessibility.h"
 

@@ -4,7 +4,7 @@
 #include "Toolkit/Widgets/Contrast.h"
 
 #include "Tests/Toolkit/ToolkitTest.h"
-#include "Toolkit/Widgets/TabularDigits.h"
+#include "Toolkit/Widgets/Text/TabularDigits.h"
 
 #include <QApplication>
 #include <QImage>

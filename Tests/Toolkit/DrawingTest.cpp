@@ -5,8 +5,8 @@
 
 #include "Tests/Toolkit/ToolkitTest.h"
 
-#include "Toolkit/Widgets/LabelWidget.h"
 #include "Toolkit/Widgets/Tables/TableWidget.h"
+#include "Toolkit/Widgets/Text/LabelWidget.h"
 
 #include <QApplication>
 #include <QImage>

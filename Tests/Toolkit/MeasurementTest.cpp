@@ -6,7 +6,7 @@
 #include "Toolkit/Font.h"
 #include "Toolkit/Label.h"
 #include "Toolkit/Screen.h"
-#include "Toolkit/Widgets/LabelWidget.h"
+#include "Toolkit/Widgets/Text/LabelWidget.h"
 
 #include <QApplication>
 #include <QFontInfo>

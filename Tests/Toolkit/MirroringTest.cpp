@@ -9,7 +9,7 @@
 #include "Toolkit/Bars/LabelItem.h"
 #include "Toolkit/Bars/SaveButton.h"
 #include "Toolkit/Label.h"
-#include "Toolkit/ScrollView.h"
+#include "Toolkit/Scrolling/ScrollView.h"
 
 #include <QGuiApplication>
 #include <QImage>

@@ -8,13 +8,13 @@
 #include "Toolkit/Bars/FlexibleSpace.h"
 #include "Toolkit/Bars/LabelItem.h"
 #include "Toolkit/Bars/SaveButton.h"
-#include "Toolkit/ScrollView.h"
+#include "Toolkit/Scrolling/ScrollView.h"
 #include "Toolkit/Widgets/Conversions.h"
-#include "Toolkit/Widgets/LabelWidget.h"
-#include "Toolkit/Widgets/OverlayScrollBar.h"
-#include "Toolkit/Widgets/ScrollSigns.h"
+#include "Toolkit/Widgets/Scrolling/OverlayScrollBar.h"
+#include "Toolkit/Widgets/Scrolling/ScrollSigns.h"
 #include "Toolkit/Widgets/Tables/EmptyLabel.h"
 #include "Toolkit/Widgets/Tables/TableWidget.h"
+#include "Toolkit/Widgets/Text/LabelWidget.h"
 
 #include <QAccessible>
 #include <QPointingDevice>

@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Toolkit/PageView.h"
+#include "Toolkit/Scrolling/PageView.h"
 
 #include "Tests/Toolkit/ToolkitTest.h"
 #include "Toolkit/Button.h"

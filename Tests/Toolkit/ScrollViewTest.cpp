@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Toolkit/ScrollView.h"
+#include "Toolkit/Scrolling/ScrollView.h"
 
 #include "Toolkit/Label.h"
 

@@ -3,7 +3,7 @@
 
 #include "Tests/Toolkit/ToolkitTest.h"
 
-#include "Toolkit/ScrollView.h"
+#include "Toolkit/Scrolling/ScrollView.h"
 #include "Toolkit/Widgets/Tables/CellWidget.h"
 #include "Toolkit/Widgets/Tables/TableWidget.h"
 

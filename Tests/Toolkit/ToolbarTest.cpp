@@ -7,8 +7,8 @@
 #include "Toolkit/Bars/LabelItem.h"
 #include "Toolkit/Bars/SaveButton.h"
 #include "Toolkit/BusyIndicator.h"
-#include "Toolkit/Widgets/LabelWidget.h"
 #include "Toolkit/Widgets/SpinnerWidget.h"
+#include "Toolkit/Widgets/Text/LabelWidget.h"
 
 #include <QTest>
 

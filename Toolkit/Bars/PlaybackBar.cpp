@@ -3,7 +3,7 @@
 
 #include "Toolkit/Bars/PlaybackBar.h"
 
-#include "Toolkit/Widgets/PlaybackBarWidget.h"
+#include "Toolkit/Widgets/Bars/PlaybackBarWidget.h"
 
 #include <utility>
 

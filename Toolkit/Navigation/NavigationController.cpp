@@ -4,7 +4,7 @@
 #include "Toolkit/Navigation/NavigationController.h"
 
 #include "Toolkit/Widgets/Conversions.h"
-#include "Toolkit/Widgets/NavigationView.h"
+#include "Toolkit/Widgets/Navigation/NavigationView.h"
 #include "Toolkit/Widgets/WindowWidget.h"
 
 #include <algorithm>

@@ -5,7 +5,7 @@
 
 #include "Toolkit/Button.h"
 #include "Toolkit/Navigation/NavigationController.h"
-#include "Toolkit/Widgets/ModalPresentation.h"
+#include "Toolkit/Widgets/Navigation/ModalPresentation.h"
 #include "Toolkit/Widgets/WindowWidget.h"
 
 #include <QWidget>

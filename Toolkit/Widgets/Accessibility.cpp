@@ -4,20 +4,20 @@
 #include "Toolkit/Widgets/Accessibility.h"
 
 #include "Toolkit/Tables/TableCell.h"
+#include "Toolkit/Widgets/Bars/Toolbar.h"
 #include "Toolkit/Widgets/Charts/ChartAccessible.h"
 #include "Toolkit/Widgets/Charts/ChartWidget.h"
 #include "Toolkit/Widgets/Conversions.h"
-#include "Toolkit/Widgets/LabelWidget.h"
-#include "Toolkit/Widgets/SheetWidget.h"
+#include "Toolkit/Widgets/Navigation/SheetWidget.h"
 #include "Toolkit/Widgets/SpinnerWidget.h"
 #include "Toolkit/Widgets/Tables/CellWidget.h"
 #include "Toolkit/Widgets/Tables/EmptyLabel.h"
 #include "Toolkit/Widgets/Tables/RowDescription.h"
 #include "Toolkit/Widgets/Tables/TableAccessible.h"
 #include "Toolkit/Widgets/Tables/TableWidget.h"
-#include "Toolkit/Widgets/Toolbar.h"
+#include "Toolkit/Widgets/Text/LabelWidget.h"
+#include "Toolkit/Widgets/Text/WrappedLabel.h"
 #include "Toolkit/Widgets/WindowWidget.h"
-#include "Toolkit/Widgets/WrappedLabel.h"
 
 #include <QAccessible>
 #include <QAccessibleWidget>

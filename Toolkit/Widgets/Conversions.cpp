@@ -4,7 +4,7 @@
 #include "Toolkit/Widgets/Conversions.h"
 
 #include "Platform/PrintableText.h"
-#include "Toolkit/Widgets/TabularDigits.h"
+#include "Toolkit/Widgets/Text/TabularDigits.h"
 
 #include <algorithm>
 #include <cmath>

@@ -3,7 +3,7 @@
 
 #include "Toolkit/Widgets/WindowWidget.h"
 
-#include "Toolkit/Widgets/SheetWidget.h"
+#include "Toolkit/Widgets/Navigation/SheetWidget.h"
 
 #include <QApplication>
 #include <QDropEvent>

@@ -3,7 +3,7 @@
 
 #pragma once
 
-#include "Export/Masking/Pseudonyms.h"
+#include "Export/Masking/Pseudonyms/Pseudonyms.h"
 #include "Export/Tracks/PositionedReader.h"
 #include "Platform/Fix.h"
 #include "Tools/Analysed/AnalysisFeed.h"

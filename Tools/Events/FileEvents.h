@@ -4,7 +4,7 @@
 #pragma once
 
 #include "Analysis/Rules/RuleSet.h"
-#include "Export/Masking/Pseudonyms.h"
+#include "Export/Masking/Pseudonyms/Pseudonyms.h"
 #include "Tools/Events/EventsOptions.h"
 
 #include <optional>

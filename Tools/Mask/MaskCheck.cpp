@@ -5,7 +5,7 @@
 
 #include "Export/Masking/KnownValues.h"
 #include "Export/Masking/MessageMask.h"
-#include "Export/Masking/SealedFile.h"
+#include "Export/Masking/Sealing/SealedFile.h"
 #include "Export/Masking/TechnologyName.h"
 #include "Platform/Linux/Files/Files.h"
 #include "PropertyLists/PropertyList.h"

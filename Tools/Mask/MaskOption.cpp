@@ -3,7 +3,7 @@
 
 #include "Tools/Mask/MaskOption.h"
 
-#include "Export/Masking/SealedFile.h"
+#include "Export/Masking/Sealing/SealedFile.h"
 #include "Recording/Files/ChunkedInput.h"
 #include "Recording/OpenMessages.h"
 #include "Tools/CommandOptions.h"

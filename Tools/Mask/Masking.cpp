@@ -5,7 +5,7 @@
 
 #include "Export/Masking/MaskedReader.h"
 #include "Export/Masking/MaskedRecording.h"
-#include "Export/Masking/SealedFile.h"
+#include "Export/Masking/Sealing/SealedFile.h"
 #include "Platform/Linux/Errno.h"
 #include "Platform/Linux/Files/Files.h"
 #include "Platform/TelephonyService.h"

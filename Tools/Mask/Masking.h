@@ -4,7 +4,7 @@
 #pragma once
 
 #include "Export/Masking/MaskReport.h"
-#include "Export/Masking/MaskSeal.h"
+#include "Export/Masking/Sealing/MaskSeal.h"
 #include "Platform/Linux/Files/AtomicFile.h"
 #include "Platform/Result.h"
 #include "Recording/MessageReader.h"

@@ -11,9 +11,16 @@ from typing import Any
 
 # Two frames: what was asked for in the first one is drawn in the second.
 DRAWN = "return new Promise((drawn) => requestAnimationFrame(() => requestAnimationFrame(() => drawn(true))))"
+IS_DARK = "return matchMedia('(prefers-color-scheme: dark)').matches"
+IS_PRINTED = "return matchMedia('print').matches"
 LONGEST_WAIT_S = 20
+RETRY_S = 0.05
 # Checking the whole page for accessibility takes a while on a busy machine.
 SCRIPT_TIMEOUT_MS = 240_000
+
+
+class DriverError(RuntimeError):
+    """The browser runs, but could not do what it was asked to, such as a script of a page that is being left."""
 
 
 class Browser(ABC):
@@ -26,31 +33,37 @@ class Browser(ABC):
 
     @abstractmethod
     def run(self, script: str, *arguments: Any) -> Any:
-        """Runs the body of a function in the page and returns its result; waits for promises."""
+        """Runs the body of a function in the page and returns its result; waits for promises. NaN and undefined become None.
+        Raises DriverError where the function throws or the page is left meanwhile."""
 
     def wait_for_drawing(self) -> None:
         self.run(DRAWN)
 
-    def wait_until(self, holds: Callable[[], object]) -> bool:
-        """Whether it holds, or comes to hold while the page draws."""
-        until = time.monotonic() + LONGEST_WAIT_S
-        while not (found := bool(holds())) and time.monotonic() < until:
-            self.wait_for_drawing()
-        return found
+    def read_until(self, script: str, holds: Callable[[Any], object], *arguments: Any) -> tuple[Any, bool]:
+        """What the script returns once that holds, and True; what it returned last, and False, after LONGEST_WAIT_S.
 
-    def loads_page(self, action: Callable[[], object], ready: str) -> bool:
-        """Whether the action makes the page load again, up to where the script `ready` returns something."""
-        self.run("document.documentElement.dataset.isOldPage = true")
-        action()
+        A page is drawn a frame after what changes it, and is loaded anew by some links: until then elements are missing.
+        So a script that throws is run again, and None never holds."""
         until = time.monotonic() + LONGEST_WAIT_S
-        while time.monotonic() < until:
+        value: Any = None
+        while True:
             try:
-                if self.run("return document.documentElement?.dataset.isOldPage === undefined") and self.run(ready):
-                    return True
-            except RuntimeError:  # a page that is being replaced runs no scripts
-                pass
-            time.sleep(0.05)
-        return False
+                value = self.run(script, *arguments)
+                if value is not None and holds(value):
+                    return value, True
+                self.wait_for_drawing()
+            except DriverError as error:
+                value = error
+                time.sleep(RETRY_S)
+            if time.monotonic() >= until:
+                return value, False
+
+    def loads_page(self, action: str, ready: str) -> bool:
+        """Whether the script `action` makes the page load again, up to where the script `ready` returns something."""
+        self.run("document.documentElement.dataset.isOldPage = true")
+        self.run(f"setTimeout(() => {{ {action} }})")  # loading begins after the script that asks for it
+        is_new, _ = self.read_until("return document.documentElement.dataset.isOldPage === undefined", bool)
+        return is_new is True and self.read_until(ready, bool)[1]
 
     @abstractmethod
     def resize(self, width: int, height: int) -> None: ...

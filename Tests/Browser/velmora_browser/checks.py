@@ -29,6 +29,13 @@ DRAWN = """return [...document.querySelectorAll('#stage canvas')].filter((canvas
     return drawn / (width - left); });"""
 LENGTH = "return Number(document.getElementById('stage')?.dataset.length)"  # of what the charts show, in ms
 GROUND = "return getComputedStyle(document.body).backgroundColor"
+SELECTED = "document.querySelector('.event[aria-selected=true] .when')"
+# The colour of the charts' ground.
+PIXEL = "return [...document.querySelector('#stage canvas').getContext('2d').getImageData(2, 2, 1, 1).data]"
+HEIGHTS = "return ['live', 'pictures'].map((id) => document.getElementById(id).offsetHeight)"
+READOUT = """return [...document.querySelectorAll('#readout tbody tr')].map((row) =>
+    [row.querySelector('th').textContent.trim(), row.querySelector('td').textContent])"""
+LOADS = 3  # of which the fastest counts: others may keep the machine busy during one
 VIOLATIONS = """
 return axe.run(document, { resultTypes: ['violations'] }).then((result) => result.violations.map((each) =>
     each.id + ': ' + each.help + ': ' + each.nodes.slice(0, 2).map((node) => node.html.slice(0, 120)).join(' | ')));
@@ -38,25 +45,23 @@ return axe.run(document, { resultTypes: ['violations'] }).then((result) => resul
 def check_start(browser: Browser, page: Path, slowest_ms: int) -> Iterator[str]:
     browser.resize(*WIDE)
     browser.set_dark(False)
-    browser.open(page)
-    browser.wait_until(lambda: browser.run(READY))
-    ready = browser.run(READY)
-    if ready is None:
-        yield "its script did not get to its end"
-    elif int(ready) > slowest_ms:
-        yield f"interactive after {ready} ms, wanted at most {slowest_ms}"
+    took_ms: list[int] = []
+    while len(took_ms) < LOADS and (not took_ms or min(took_ms) > slowest_ms):
+        browser.open(page)
+        ready, is_ready = browser.read_until(READY, bool)
+        if not is_ready:
+            yield f"its script did not get to its end: {ready}"
+            return
+        took_ms.append(int(ready))
+    if min(took_ms) > slowest_ms:
+        yield f"interactive after {took_ms} ms, wanted at most {slowest_ms} once"
     if not browser.run("return document.getElementById('pictures').hidden"):
         yield "the pictures are shown beside the charts"
 
 
 def check_drawn(browser: Browser) -> Iterator[str]:
-    shares: list[float] = []
-
-    def are_drawn() -> bool:
-        shares[:] = browser.run(DRAWN)
-        return bool(shares) and min(shares) >= 0.2
-
-    if not browser.wait_until(are_drawn):
+    shares, are_drawn = browser.read_until(DRAWN, lambda found: found and min(found) >= 0.2)
+    if not are_drawn:
         yield f"charts are not drawn: {shares} of their columns have a line"
 
 
@@ -67,9 +72,9 @@ def centre(browser: Browser) -> tuple[int, int]:
 
 
 def check_changes(browser: Browser, what: str, script: str, action: Callable[[], object]) -> Iterator[str]:
-    before = browser.run(script)
+    before, _ = browser.read_until(script, lambda found: True)
     action()
-    if not browser.wait_until(lambda: browser.run(script) != before):
+    if not browser.read_until(script, lambda found: found != before)[1]:
         yield f"{what} changes nothing: {before}"
 
 
@@ -94,15 +99,14 @@ def check_events(browser: Browser) -> Iterator[str]:
     if not count:
         yield "no events are listed"
         return
-    browser.run("document.querySelectorAll('.event')[2].click()")
-    browser.wait_until(lambda: browser.run("return document.querySelector('.event[aria-selected=true]') !== null"))
-    browser.wait_for_drawing()
-    chosen, when = browser.run("const row = document.querySelector('.event[aria-selected=true]');"
-                               "return [row !== null, row && row.querySelector('.when').textContent.slice(0, 12)]")
-    if not chosen:
-        yield "no event is chosen by a click"
-    elif when not in browser.run(CURSOR):
-        yield f"the event of {when} has moved the cursor to {browser.run(CURSOR)}"
+    when = browser.run("const row = document.querySelectorAll('.event')[2], { textContent } = row.querySelector('.when');"
+                       "row.click(); return textContent")
+    chosen, is_chosen = browser.read_until(f"return {SELECTED}.textContent", lambda found: found == when)
+    if not is_chosen:
+        yield f"a click at the event of {when} chooses {chosen}"
+    cursor, is_there = browser.read_until(CURSOR, lambda found: when[:12] in found)
+    if not is_there:
+        yield f"the event of {when} has moved the cursor to {cursor}"
 
 
 def check_touch(browser: Browser) -> Iterator[str]:
@@ -110,35 +114,34 @@ def check_touch(browser: Browser) -> Iterator[str]:
         yield "fingers do not reach the charts"
     x, y = centre(browser)
     for what, begin, end, sign in (("fingers that move apart", 60, 240, -1), ("fingers that come together", 240, 60, 1)):
-        before = browser.run(LENGTH)
+        before, _ = browser.read_until(LENGTH, bool)
         if not browser.pinch((x, y), begin, end):
             return
-        if not browser.wait_until(lambda sign=sign, before=before:  # type: ignore[misc]
-                                  (browser.run(LENGTH) - before) * sign > 0):
-            yield f"{what} do not zoom: {before} ms before, {browser.run(LENGTH)} after"
+        after, zoomed = browser.read_until(LENGTH, lambda found, sign=sign, before=before:  # type: ignore[misc]
+                                           found and (found - before) * sign > 0)
+        if not zoomed:
+            yield f"{what} do not zoom: {before} ms before, {after} after"
 
 
 def check_zone(browser: Browser) -> Iterator[str]:
     script = "return document.querySelector('time').textContent"
-    yield from check_changes(browser, "the choice of the zone", script,
-                             lambda: browser.run("document.querySelectorAll('#tools input')[1].click()"))
-    browser.run("document.querySelectorAll('#tools input')[0].click()")
+    for which, what in ((1, "the choice of the zone"), (0, "the choice of UTC")):
+        yield from check_changes(browser, what, script, lambda which=which:  # type: ignore[misc]
+                                 browser.run(f"document.querySelectorAll('#tools input')[{which}].click()"))
 
 
 def check_width(browser: Browser, size: tuple[int, int]) -> Iterator[str]:
     browser.resize(*size)
-    browser.wait_for_drawing()
-    inner, scroll = browser.run("return [innerWidth, document.documentElement.scrollWidth]")
-    if inner != size[0]:
-        yield f"the window is {inner} wide, wanted {size[0]}"
-    if scroll > inner:
-        yield f"at {inner} the page is {scroll} wide"
+    widths, fit = browser.read_until("return [innerWidth, document.documentElement.scrollWidth]",
+                                     lambda found: found[0] == size[0] and found[1] <= size[0])
+    if not fit:
+        yield f"window and page are {widths} wide, wanted {size[0]} and no more"
 
 
 def check_dark(browser: Browser) -> Iterator[str]:
     yield from check_changes(browser, "dark", GROUND, lambda: browser.set_dark(True))
-    pixel = browser.run("return [...document.querySelector('#stage canvas').getContext('2d').getImageData(2, 2, 1, 1).data]")
-    if max(pixel[:3]) > 100:
+    pixel, is_dark = browser.read_until(PIXEL, lambda found: max(found[:3]) <= 100)
+    if not is_dark:
         yield f"the charts stay light in the dark: {pixel}"
 
 
@@ -150,9 +153,9 @@ def check_accessible(browser: Browser, axe: str | None, where: str) -> Iterator[
 
 def check_print(browser: Browser) -> Iterator[str]:
     browser.set_print(True)
-    charts, pictures = browser.run("return ['live', 'pictures'].map((id) => document.getElementById(id).offsetHeight)")
-    if charts or not pictures:
-        yield f"on paper the charts are {charts} high and the pictures {pictures}"
+    heights, are_printed = browser.read_until(HEIGHTS, lambda found: found[0] == 0 and found[1] > 0)
+    if not are_printed:
+        yield f"on paper the charts and the pictures are {heights} high, wanted pictures alone"
     browser.set_print(False)
     if not browser.pdf().startswith(b"%PDF"):
         yield "printing makes no document"
@@ -171,15 +174,21 @@ def check_page(browser: Browser, page: Path, axe: str | None, slowest_ms: int) -
     yield from browser.problems()
 
 
+def with_values(readout: list[list[str]]) -> set[str]:
+    """The letters of the files that have a value at the cursor."""
+    return {name[0] for name, value in readout if name[1:3] == ": " and value != "\u2013"}
+
+
 def check_comparison(browser: Browser, page: Path, lengths_ms: tuple[int, int]) -> Iterator[str]:
     """The charts of two files lie over each other, from the start of each, or one after the other."""
     yield from check_start(browser, page, 60_000)
     yield from check_drawn(browser)
-    length = browser.run(LENGTH)
-    if abs(length - max(lengths_ms)) > 1:
+    length, is_longer = browser.read_until(LENGTH, lambda found: abs(found - max(lengths_ms)) <= 1)
+    if not is_longer:
         yield f"over each other the charts are {length} ms long, wanted the longer of {lengths_ms}"
-    if "since the start" not in browser.run(RANGE):
-        yield f"over each other the charts show {browser.run(RANGE)}"
+    shown, is_relative = browser.read_until(RANGE, lambda found: "since the start" in found)
+    if not is_relative:
+        yield f"over each other the charts show {shown}"
     names = browser.run("return [...document.querySelectorAll('.legend label')].map((each) => each.textContent.trim())")
     for letter in "AB":
         if not any(name.startswith(letter + ": ") for name in names):
@@ -189,14 +198,12 @@ def check_comparison(browser: Browser, page: Path, lengths_ms: tuple[int, int]) 
     left = x - browser.run(STAGE + "return box.width / 2") + 58
     shorter = left + (browser.run(STAGE + "return box.width") - 58) * min(lengths_ms) / max(lengths_ms)
     browser.move((int((left + shorter) / 2), y))
-    read = browser.run("return [...document.querySelectorAll('#readout tbody tr')].map((row) =>"
-                       "[row.querySelector('th').textContent.trim(), row.querySelector('td').textContent])")
-    for letter in "AB":
-        if not any(name.startswith(letter + ": ") and value != "\u2013" for name, value in read):
-            yield f"at the same time since the start file {letter} has nothing: {read}"
+    read, have_values = browser.read_until(READOUT, lambda found: with_values(found) >= {"A", "B"})
+    if not have_values:
+        yield f"at the same time since the start a file has nothing: {read}"
     chosen = "[...document.querySelectorAll('.event')].find((row) => row.querySelector('.when').textContent.startsWith('B '))"
     yield from check_changes(browser, "the choice of an event of the second file", CURSOR, lambda: browser.run(chosen + ".click()"))
-    if not browser.loads_page(lambda: browser.run("document.getElementById('arrangement').click()"), READY):
+    if not browser.loads_page("document.getElementById('arrangement').click()", READY):
         yield "the choice of the other arrangement does not load the page again"
         return
     if browser.run(LENGTH) <= max(lengths_ms) + 1:

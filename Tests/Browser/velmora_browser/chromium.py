@@ -12,7 +12,7 @@ import urllib.request
 from pathlib import Path
 from typing import Any
 
-from .browser import SCRIPT_TIMEOUT_MS, Browser, key_actions, pinch_actions, pointer_actions
+from .browser import IS_DARK, IS_PRINTED, SCRIPT_TIMEOUT_MS, Browser, DriverError, key_actions, pinch_actions, pointer_actions
 
 ELEMENT = "element-6066-11e4-a52e-4f735466cecf"
 
@@ -49,7 +49,7 @@ class Chromium(Browser):
             with urllib.request.urlopen(request, timeout=SCRIPT_TIMEOUT_MS / 1000 + 20) as answer:
                 return json.load(answer)["value"]
         except urllib.error.HTTPError as error:
-            raise RuntimeError(error.read().decode()[:2000]) from error
+            raise DriverError(error.read().decode()[:2000]) from error
 
     def _developer(self, command: str, **parameters: Any) -> Any:
         return self._call("POST", "/goog/cdp/execute", {"cmd": command, "params": parameters})
@@ -63,13 +63,19 @@ class Chromium(Browser):
 
     def resize(self, width: int, height: int) -> None:
         self._developer("Emulation.setDeviceMetricsOverride", width=width, height=height, deviceScaleFactor=1, mobile=False)
+        self.read_until("return innerWidth", lambda inner: inner == width)
+        self.wait_for_drawing()
 
     def set_dark(self, dark: bool) -> None:
         value = "dark" if dark else "light"
         self._developer("Emulation.setEmulatedMedia", media="", features=[{"name": "prefers-color-scheme", "value": value}])
+        self.read_until(IS_DARK, lambda found: found == dark)
+        self.wait_for_drawing()
 
     def set_print(self, printed: bool) -> None:
         self._developer("Emulation.setEmulatedMedia", media="print" if printed else "")
+        self.read_until(IS_PRINTED, lambda found: found == printed)
+        self.wait_for_drawing()
 
     def _act(self, actions: list[dict[str, Any]]) -> None:
         self._call("POST", "/actions", {"actions": actions})

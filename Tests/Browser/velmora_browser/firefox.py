@@ -12,7 +12,7 @@ import time
 from pathlib import Path
 from typing import Any
 
-from .browser import SCRIPT_TIMEOUT_MS, Browser, key_actions, pointer_actions
+from .browser import IS_DARK, IS_PRINTED, SCRIPT_TIMEOUT_MS, Browser, DriverError, key_actions, pointer_actions
 
 # It must not look for updates and the like: these would be requests of its own.
 PREFERENCES = {
@@ -86,7 +86,7 @@ class Firefox(Browser):
         self._socket.sendall(str(len(content)).encode() + b":" + content)
         _, _, error, result = self._received()
         if error:
-            raise RuntimeError(json.dumps(error)[:2000])
+            raise DriverError(json.dumps(error)[:2000])
         return result["value"] if isinstance(result, dict) and "value" in result else result
 
     def _in_chrome(self, script: str, *arguments: Any) -> Any:
@@ -107,18 +107,18 @@ class Firefox(Browser):
         # The page alone: a window is no narrower than its toolbar.
         self._call("WebDriver:SetWindowRect", {"width": 1400, "height": height + 200})
         self._in_chrome(PAGE_SIZE, width, height)
-        self.wait_until(lambda: self.run("return innerWidth === arguments[0]", width))
+        self.read_until("return innerWidth", lambda inner: inner == width)
         self.wait_for_drawing()
 
     def set_dark(self, dark: bool) -> None:
         self._in_chrome("Services.prefs.setIntPref(arguments[0], arguments[1])",
                         "layout.css.prefers-color-scheme.content-override", DARK if dark else LIGHT)
-        self.wait_until(lambda: self.run("return matchMedia('(prefers-color-scheme: dark)').matches") == dark)
+        self.read_until(IS_DARK, lambda found: found == dark)
         self.wait_for_drawing()
 
     def set_print(self, printed: bool) -> None:
         self._in_chrome(MEDIUM, "print" if printed else "")
-        self.wait_until(lambda: self.run("return matchMedia('print').matches") == printed)
+        self.read_until(IS_PRINTED, lambda found: found == printed)
         self.wait_for_drawing()
 
     def _act(self, actions: list[dict[str, Any]]) -> None:

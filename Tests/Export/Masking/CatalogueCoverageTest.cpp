@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Export/Masking/PropertyKeys.h"
+#include "Export/Masking/PropertyLists/PropertyKeys.h"
 #include "LogGenerator/Observations/Catalogue.h"
 #include "LogMessages/LiveModem.h"
 #include "Tests/LogGenerator/Observations/DecodedTechnology.h"

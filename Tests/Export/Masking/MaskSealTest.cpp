@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Export/Masking/MaskSeal.h"
+#include "Export/Masking/Sealing/MaskSeal.h"
 
 #include "Tests/Export/Masking/ExampleKey.h"
 

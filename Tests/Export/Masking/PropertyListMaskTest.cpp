@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
-#include "Export/Masking/PropertyListMask.h"
+#include "Export/Masking/PropertyLists/PropertyListMask.h"
 
 #include "LogMessages/LiveModem.h"
 #include "Platform/TelephonyService.h"

@@ -27,6 +27,17 @@ class ChartWalk(Walk):
     def heard(self, name):
         self.wait(f"an announcement of {name!r}", lambda: name in self.names)
 
+    def check_size(self, chart):
+        place = chart.get_extents(Atspi.CoordType.WINDOW)
+        assert (place.width, place.height) == (400, 300), (place.width, place.height)
+
+    def check_table(self):
+        table = self.see("table", "Values, Over time")
+        assert (table.get_n_rows(), table.get_n_columns()) == (61, 2)
+        assert table.get_column_description(1) == "Level, Serving (dBm)"
+        cells = [table.get_accessible_at(row, column).get_name() for row in (0, 60) for column in (0, 1)]
+        assert cells == ["11:59:00", "\u2212100.00", "12:00:00", "\u221285.00"], cells
+
     def run(self):
         self.application = self.start("tests/chart-window")
         listener = Atspi.EventListener.new(lambda event: self.names.append(event.source.get_name()))
@@ -35,8 +46,7 @@ class ChartWalk(Walk):
         assert chart.get_description() == (
             "Level, Serving, \u221285.00 dBm now, minimum \u2212100.00, maximum \u221285.00 over 1 minute"
         ), chart.get_description()
-        place = chart.get_extents(Atspi.CoordType.WINDOW)
-        assert (place.width, place.height) == (400, 300), (place.width, place.height)
+        self.settled(lambda: self.check_size(chart))
 
         self.act(chart, "Decrease")
         self.heard("Over time, 12:00:00, Level, Serving \u221285.00 dBm")
@@ -46,11 +56,7 @@ class ChartWalk(Walk):
         self.see("chart", "Over time, 12:00:00")
 
         self.act(chart, "Toggle")
-        table = self.see("table", "Values, Over time")
-        assert (table.get_n_rows(), table.get_n_columns()) == (61, 2)
-        assert table.get_column_description(1) == "Level, Serving (dBm)"
-        cells = [table.get_accessible_at(row, column).get_name() for row in (0, 60) for column in (0, 1)]
-        assert cells == ["11:59:00", "\u2212100.00", "12:00:00", "\u221285.00"], cells
+        self.settled(self.check_table)
         self.act(chart, "Toggle")
         self.wait("the chart without its table", lambda: self.find("table") is None)
 

@@ -3,7 +3,7 @@
 
 #pragma once
 
-#include "Toolkit/Widgets/WrappedLabel.h"
+#include "Toolkit/Widgets/Text/WrappedLabel.h"
 
 namespace velmora {
 

@@ -3,10 +3,10 @@
 
 #include "Toolkit/Widgets/Tables/TableInput.h"
 
-#include "Toolkit/Widgets/ScrollWidget.h"
+#include "Toolkit/Widgets/Scrolling/ScrollWidget.h"
+#include "Toolkit/Widgets/Scrolling/TouchScroll.h"
 #include "Toolkit/Widgets/Tables/CellWidget.h"
 #include "Toolkit/Widgets/Tables/TableWidget.h"
-#include "Toolkit/Widgets/TouchScroll.h"
 
 #include <QContextMenuEvent>
 #include <QKeyEvent>

@@ -7,8 +7,8 @@
 #include "Toolkit/Tables/TableView.h"
 #include "Toolkit/Widgets/Accessibility.h"
 #include "Toolkit/Widgets/Conversions.h"
-#include "Toolkit/Widgets/OverlayScrollBar.h"
-#include "Toolkit/Widgets/ScrollWidget.h"
+#include "Toolkit/Widgets/Scrolling/OverlayScrollBar.h"
+#include "Toolkit/Widgets/Scrolling/ScrollWidget.h"
 #include "Toolkit/Widgets/Tables/CellWidget.h"
 #include "Toolkit/Widgets/Tables/EmptyLabel.h"
 
