@@ -4,6 +4,8 @@
 #include "Toolkit/Navigation/NavigationController.h"
 
 #include "Toolkit/Widgets/Conversions.h"
+#include "Toolkit/Widgets/Navigation/BackButton.h"
+#include "Toolkit/Widgets/Navigation/CommandButton.h"
 #include "Toolkit/Widgets/Navigation/NavigationView.h"
 #include "Toolkit/Widgets/WindowWidget.h"
 

@@ -73,6 +73,7 @@ def run_clients(options: Options) -> None:
             wait_for("a client's first display", lambda: lines.count(DISPLAY))
         before = [watch.lines.count(DISPLAY) for watch in watches]
         sent = send_malformed(sandbox, malformed, options.seconds, options.seed)
+        next_redraw(screen, since_s=begin + REDRAW_S / 2)  # a gap has two ends
         result = ClientsResult(
             seconds=options.seconds,
             sent=sent,

@@ -6,12 +6,12 @@ import random
 import tempfile
 from pathlib import Path
 
-from velmora_chaos.checks import expect, wait_for
+from velmora_chaos.checks import expect
 from velmora_chaos.failing.recording import messages
 from velmora_chaos.malformed import VARIANTS, malformed_variant
 from velmora_chaos.options import Options
-from velmora_chaos.raw_client import RawClient, connect
-from velmora_chaos.sandbox import SERVER_PORT, Sandbox
+from velmora_chaos.raw_client import RawClient, connect, wait_for_port
+from velmora_chaos.sandbox import Sandbox
 
 ROUNDS = 20
 COUNT = 200  # messages that are recorded
@@ -23,7 +23,7 @@ def run_closed(options: Options) -> None:
         service = sandbox.start_closed(
             "velmora-telephonyd", "--source", "scenario:gsm,seed=1,speed=100", "--log-level", "7"
         )
-        wait_for("the service's port", lambda: sandbox.ports(SERVER_PORT))
+        wait_for_port(sandbox.port())
         chance = random.Random(options.seed)
         for number in range(ROUNDS * VARIANTS):
             with connect(sandbox.port()) as connection:

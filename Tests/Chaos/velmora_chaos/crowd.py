@@ -27,6 +27,7 @@ HOARD = 15 << 20
 MOST_HOARDED_KIB = 64 << 10
 GROWTH_KIB = 40 << 10  # besides, for its clients and the allocator; without a bound it is three times as much
 REFUSED = 5_000
+REFUSED_KIND = "refused requests for log channels"
 LINES_PER_SECOND = 11  # of a kind, with the count of those left out
 
 
@@ -125,6 +126,17 @@ def counted_lines(texts: list[str], kind: str) -> int:
     return sum(int(found[1]) for found in counts if found)
 
 
+def refused_lines(texts: list[str]) -> int:
+    """How many lines say that a channel to the service itself was refused."""
+    return sum("that name is the service's own" in text for text in texts)
+
+
+def reported(service: Program) -> int:
+    """How many refused requests the service has logged or counted."""
+    texts = [line.text for line in service.lines.all()]
+    return refused_lines(texts) + counted_lines(texts, REFUSED_KIND)
+
+
 def run_crowd(options: Options) -> None:
     """Runs the crowd, prints what the service did and checks it."""
     with tempfile.TemporaryDirectory() as directory, Sandbox(options.build, Path(directory)) as sandbox:
@@ -137,15 +149,15 @@ def run_crowd(options: Options) -> None:
         wait_for("a display beside unfinished frames", lambda: watch.lines.count(DISPLAY) > before)
         displays = watch.lines.count(DISPLAY) - before
         refused_s = ask_for_itself(sandbox.port())
-        time.sleep(1.5)  # the last count comes when its second is over
+        wait_for("the last count, which comes when its second is over", lambda: reported(service) >= REFUSED)
         texts = [line.text for line in service.lines.all()]
         result = CrowdResult(
             late_s=late_s,
             growth_kib=growth_kib,
             displays=displays,
             refused_s=refused_s,
-            lines=sum("that name is the service's own" in text for text in texts),
-            counted=counted_lines(texts, "refused requests for log channels"),
+            lines=refused_lines(texts),
+            counted=counted_lines(texts, REFUSED_KIND),
         )
         print(result, flush=True)
         result.check()

@@ -111,14 +111,18 @@ def measure_flood(service: Program, screen: Program, seconds: int, begin_s: floa
     start = time.monotonic()
     time.sleep(seconds)
     passed = time.monotonic() - start
-    seen = redraws(screen)
-    since = [redraw for redraw in seen if redraw.when_s > begin_s]
-    expect(len(since) > HISTORY + 2, f"{len(since)} redraws, wanted more than {HISTORY + 2}")
+    logged_meanwhile = dropped(service)[logged:]
+
+    def redraws_since() -> list[Redraw]:
+        return [redraw for redraw in redraws(screen) if redraw.when_s > begin_s]
+
+    wait_for("a redraw once the history is full", lambda: len(redraws_since()) > HISTORY + 2)
+    since = redraws_since()
     return FloodResult(
         passed_s=passed,
-        dropped=dropped(service)[logged:],
+        dropped=logged_meanwhile,
         redraws=since,
-        gap_s=longest_gap_s(seen, begin_s),
+        gap_s=longest_gap_s(redraws(screen), begin_s),
         service_before_kib=service_before,
         service_after_kib=service.resident_kib(),
     )

@@ -10,7 +10,7 @@ from collections.abc import Mapping
 from pathlib import Path
 from typing import Any
 
-from velmora_chaos.checks import expect
+from velmora_chaos.checks import expect, wait_for
 from velmora_chaos.sandbox import Sandbox
 
 REQUEST, REPLY, ONE_WAY = 1, 2, 4
@@ -43,15 +43,37 @@ def connect(port: Path, limit_s: float = CONNECT_S) -> socket.socket:
             raise
 
 
+def wait_for_port(port: Path) -> None:
+    """Waits until the port takes connections: its file is there a moment before."""
+
+    def takes_connections() -> bool:
+        try:
+            connect(port).close()
+        except (FileNotFoundError, ConnectionRefusedError):
+            return False
+        return True
+
+    wait_for(f"the port {port.name}", takes_connections)
+
+
+def received(connection: socket.socket, length: int) -> bytes:
+    """So many bytes; raises Problem where the peer closes before. A socket with a time-out returns what has arrived,
+    even where it is asked to wait for all."""
+    data = bytearray()
+    while len(data) < length:
+        part = connection.recv(length - len(data))
+        expect(part, "no reply")
+        data += part
+    return bytes(data)
+
+
 def call(connection: socket.socket, request: Mapping[str, Any]) -> dict[str, Any]:
     """Sends a request and returns the reply's dictionary; an empty one for an empty reply."""
     connection.sendall(frame(REQUEST, plistlib.dumps(dict(request)), 1))
-    header = connection.recv(HEADER.size, socket.MSG_WAITALL)
-    expect(len(header) == HEADER.size, "no reply")
-    length, _, _, _ = HEADER.unpack(header)
+    length, _, _, _ = HEADER.unpack(received(connection, HEADER.size))
     if length == 0:
         return {}
-    reply = plistlib.loads(connection.recv(length, socket.MSG_WAITALL))
+    reply = plistlib.loads(received(connection, length))
     expect(isinstance(reply, dict), "the reply is not a dictionary")
     return dict(reply)
 

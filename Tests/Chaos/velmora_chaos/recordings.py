@@ -16,11 +16,12 @@ from velmora_chaos.options import Options
 from velmora_chaos.sandbox import Sandbox
 
 DRIVE = "scenario:gsm,seed=1,speed="
-DRIVE_MESSAGES = 4000  # more than a round records
+DRIVE_MESSAGES = 12_000  # more than a round records, on a busy machine too
 ROUND_SPEED = 20
 MOST_ROUNDS = 10
 NOTICED_S = 1.0
-SLACK_S = 1.0  # of a busy machine
+SLACK_S = 4.0  # of a busy machine
+SECOND_S = 60  # for another recorder to say that it cannot record there
 LATE = 200  # messages that may arrive between a copy and the truncation after it
 FILE = "drive.pcapng"
 NEXT_FILE = "drive-2.pcapng"
@@ -52,6 +53,11 @@ def whole_blocks(recording: bytes) -> bytes:
     return recording[:at]
 
 
+def recorded(path: Path) -> list[bytes]:
+    """The messages of a file that is being recorded to, none where it is not there yet."""
+    return list(messages(whole_blocks(path.read_bytes()))) if path.exists() else []
+
+
 def gap(drive: Sequence[bytes], before: Sequence[bytes], after: Sequence[bytes]) -> int | None:
     """How many of the drive's messages are missing between what was recorded before and after the change; a few
     may be in both. None where one of the two is not a part of the drive without a gap."""
@@ -77,7 +83,7 @@ def try_change(options: Options, drive: Sequence[bytes], change: str, chance: ra
             env=sandbox.environment,
             stderr=subprocess.PIPE,
             text=True,
-            timeout=10,
+            timeout=SECOND_S,
             check=False,
         )
         expect(second.returncode == 1, f"a second recorder ended with {second.returncode}, wanted 1")
@@ -89,6 +95,7 @@ def try_change(options: Options, drive: Sequence[bytes], change: str, chance: ra
             start = time.monotonic()
             wait_for(f"that the file {change}", lambda: recorder.lines.count(f"{path} {change}; "))
             noticed_s = time.monotonic() - start
+            wait_for("messages in the next file", lambda: recorded(path.parent / NEXT_FILE))
             time.sleep(chance.uniform(0, 0.7))
             recorder.end_with(1)
             if change != "was truncated":

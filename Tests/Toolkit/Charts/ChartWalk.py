@@ -11,10 +11,10 @@ import sys
 sys.dont_write_bytecode = True
 sys.path.insert(0, os.path.join(os.path.dirname(os.path.abspath(__file__)), "..", "..", "App"))
 
-from AccessibilityWalk import Atspi, Walk  # noqa: E402
+from ScreenReader import Atspi, ScreenReader  # noqa: E402
 
 
-class ChartWalk(Walk):
+class ChartWalk(ScreenReader):
     def __init__(self, build, directory):
         super().__init__(build, directory)
         self.environment["TZ"] = "UTC"

@@ -5,6 +5,7 @@
 
 #include "Toolkit/Widgets/Charts/ChartInput.h"
 #include "Toolkit/Widgets/Charts/ChartWidget.h"
+#include "Toolkit/Widgets/TouchEvent.h"
 
 #include <QAbstractScrollArea>
 #include <QApplication>
@@ -25,23 +26,18 @@ constexpr double reach = 12;
 } // namespace
 
 bool ChartInput::handle(QEvent* event) {
-    switch (event->type()) {
-    case QEvent::TouchBegin:
-    case QEvent::TouchUpdate:
-    case QEvent::TouchEnd:
-    case QEvent::TouchCancel:
-        touch(*static_cast<QTouchEvent*>(event));
+    if (const QTouchEvent* const fingers = touchEvent(event)) {
+        touch(*fingers);
         event->accept();
         return true;
-    case QEvent::NativeGesture: {
-        const auto* const gesture = static_cast<QNativeGestureEvent*>(event);
-        if (gesture->gestureType() != Qt::ZoomNativeGesture)
-            return false;
-        zoom(1 / std::max(1 + gesture->value(), 0.1), gesture->position().x());
-        return true;
     }
-    default: return false;
-    }
+    if (event->type() != QEvent::NativeGesture)
+        return false;
+    const auto* const gesture = static_cast<QNativeGestureEvent*>(event);
+    if (gesture->gestureType() != Qt::ZoomNativeGesture)
+        return false;
+    zoom(1 / std::max(1 + gesture->value(), 0.1), gesture->position().x());
+    return true;
 }
 
 void ChartInput::touch(const QTouchEvent& event) {

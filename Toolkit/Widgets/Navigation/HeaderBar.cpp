@@ -4,121 +4,26 @@
 #include "Toolkit/Widgets/Navigation/HeaderBar.h"
 
 #include "Toolkit/Widgets/Conversions.h"
+#include "Toolkit/Widgets/Navigation/BackButton.h"
+#include "Toolkit/Widgets/Navigation/CommandButton.h"
+#include "Toolkit/Widgets/Text/LabelWidget.h"
 
-#include <QFontMetricsF>
-#include <QKeyEvent>
+#include <QEvent>
 #include <QPainter>
-#include <QPainterPath>
 #include <QStyle>
-#include <QStyleOptionFocusRect>
 
 #include <algorithm>
-#include <cmath>
 
 namespace velmora {
 
 namespace {
 
-constexpr int chevronWidth = 22;
 constexpr int leastHeight = 52;
 
 } // namespace
 
-BackButton::BackButton(QWidget* parent) : QAbstractButton(parent) {
-    setObjectName("velmora.back");
-    setFont(toQt(Font::systemFontOfSize(15)));
-    setFocusPolicy(Qt::TabFocus);
-    setAttribute(Qt::WA_Hover);
-}
-
-QSize BackButton::sizeHint() const {
-    const double advance = QFontMetricsF(font()).horizontalAdvance(escapedLine(text()));
-    return {std::max(static_cast<int>(std::ceil(advance)) + chevronWidth + 8, 44), 44};
-}
-
-void BackButton::paintEvent(QPaintEvent* /*event*/) {
-    QPainter painter(this);
-    QColor ink = palette().color(QPalette::WindowText);
-    if (isDown() || underMouse()) {
-        QColor ground = ink;
-        ground.setAlphaF(isDown() ? 0.16F : 0.08F);
-        painter.fillRect(rect(), ground);
-    }
-    const double middle = height() / 2.0;
-    const bool isMirrored = isRightToLeft();
-    const auto x = [&](double left) { return isMirrored ? width() - left : left; };
-    QPainterPath chevron;
-    chevron.moveTo(x(14), middle - 7);
-    chevron.lineTo(x(7), middle);
-    chevron.lineTo(x(14), middle + 7);
-    painter.setRenderHint(QPainter::Antialiasing);
-    painter.setPen(QPen(ink, 2, Qt::SolidLine, Qt::RoundCap, Qt::RoundJoin));
-    painter.drawPath(chevron);
-    painter.setPen(ink);
-    const QRect room = QStyle::visualRect(layoutDirection(), rect(), rect().adjusted(chevronWidth, 0, -4, 0));
-    const Qt::Alignment side = isMirrored ? Qt::AlignRight : Qt::AlignLeft;
-    painter.drawText(room,
-                     static_cast<int>(side | Qt::AlignAbsolute | Qt::AlignVCenter) | Qt::TextSingleLine |
-                         (text().isRightToLeft() ? Qt::TextForceRightToLeft : Qt::TextForceLeftToRight),
-                     QFontMetricsF(font()).elidedText(escapedLine(text()), Qt::ElideRight, room.width()));
-    if (hasFocus()) {
-        QStyleOptionFocusRect option;
-        option.initFrom(this);
-        option.backgroundColor = palette().color(QPalette::Window);
-        option.state |= QStyle::State_KeyboardFocusChange;
-        style()->drawPrimitive(QStyle::PE_FrameFocusRect, &option, &painter, this);
-    }
-}
-
-void BackButton::keyPressEvent(QKeyEvent* event) {
-    if (event->key() == Qt::Key_Return || event->key() == Qt::Key_Enter)
-        click();
-    else
-        QAbstractButton::keyPressEvent(event);
-}
-
-HeaderButton::HeaderButton(QWidget* parent) : QAbstractButton(parent) {
-    setObjectName("velmora.headerButton");
-    setFont(toQt(Font::systemFontOfSize(15)));
-    setFocusPolicy(Qt::TabFocus);
-    setAttribute(Qt::WA_Hover);
-}
-
-QSize HeaderButton::sizeHint() const {
-    const double advance = QFontMetricsF(font()).horizontalAdvance(text());
-    return {std::max(static_cast<int>(std::ceil(advance)) + 20, 44), 44};
-}
-
-void HeaderButton::paintEvent(QPaintEvent* /*event*/) {
-    QPainter painter(this);
-    const QColor ink = palette().color(QPalette::WindowText);
-    QColor ground = ink;
-    ground.setAlphaF(isDown() ? 0.2F : underMouse() ? 0.14F : isChecked() ? 0.12F : 0.06F);
-    painter.setRenderHint(QPainter::Antialiasing);
-    painter.setPen(Qt::NoPen);
-    painter.setBrush(ground);
-    painter.drawRoundedRect(QRectF(rect()).adjusted(0, 6, 0, -6), 6, 6);
-    painter.setPen(ink);
-    painter.drawText(rect(), static_cast<int>(Qt::AlignCenter) | Qt::TextSingleLine,
-                     QFontMetricsF(font()).elidedText(text(), Qt::ElideRight, width()));
-    if (hasFocus()) {
-        QStyleOptionFocusRect option;
-        option.initFrom(this);
-        option.backgroundColor = palette().color(QPalette::Window);
-        option.state |= QStyle::State_KeyboardFocusChange;
-        style()->drawPrimitive(QStyle::PE_FrameFocusRect, &option, &painter, this);
-    }
-}
-
-void HeaderButton::keyPressEvent(QKeyEvent* event) {
-    if (event->key() == Qt::Key_Return || event->key() == Qt::Key_Enter)
-        click();
-    else
-        QAbstractButton::keyPressEvent(event);
-}
-
 HeaderBar::HeaderBar()
-    : _back(new BackButton(this)), _command(new HeaderButton(this)), _title(new HeadingLabel) {
+    : _back(new BackButton(this)), _command(new CommandButton(this)), _title(new LabelWidget) {
     setObjectName("velmora.header");
     setAutoFillBackground(true);
     _title->setParent(this);

@@ -4,6 +4,7 @@
 #include "Toolkit/Widgets/Scrolling/PageWidget.h"
 
 #include "Toolkit/Widgets/Scrolling/TouchScroll.h"
+#include "Toolkit/Widgets/TouchEvent.h"
 
 #include <QApplication>
 #include <QKeyEvent>
@@ -40,14 +41,12 @@ void PageWidget::layoutPage() {
 }
 
 bool PageWidget::viewportEvent(QEvent* event) {
-    switch (event->type()) {
-    case QEvent::TouchBegin:
-    case QEvent::TouchUpdate:
-    case QEvent::TouchEnd:
-    case QEvent::TouchCancel:
-        touch(*static_cast<QTouchEvent*>(event));
+    if (const QTouchEvent* const fingers = touchEvent(event)) {
+        touch(*fingers);
         event->accept();
         return true;
+    }
+    switch (event->type()) {
     case QEvent::ScrollPrepare: {
         auto* const prepare = static_cast<QScrollPrepareEvent*>(event);
         prepare->setViewportSize(viewport()->size());

@@ -6,6 +6,7 @@
 #include "Toolkit/Widgets/Scrolling/ScrollSigns.h"
 #include "Toolkit/Widgets/Scrolling/TouchScroll.h"
 #include "Toolkit/Widgets/Tables/TableWidget.h"
+#include "Toolkit/Widgets/TouchEvent.h"
 
 #include <QScrollEvent>
 #include <QScrollPrepareEvent>
@@ -69,10 +70,9 @@ bool ScrollWidget::event(QEvent* event) {
         setPosition(static_cast<QScrollEvent*>(event)->contentPos().x());
         return true;
     }
-    const bool isTouch = event->type() == QEvent::TouchBegin || event->type() == QEvent::TouchUpdate ||
-                         event->type() == QEvent::TouchEnd || event->type() == QEvent::TouchCancel;
-    if (isTouch && testAttribute(Qt::WA_AcceptTouchEvents) && maximumOffset() > 0) {
-        (void)scrollByTouch(*this, *static_cast<QTouchEvent*>(event));
+    const QTouchEvent* const fingers = touchEvent(event);
+    if (fingers && testAttribute(Qt::WA_AcceptTouchEvents) && maximumOffset() > 0) {
+        (void)scrollByTouch(*this, *fingers);
         event->accept();
         return true;
     }

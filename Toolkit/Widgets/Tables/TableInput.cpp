@@ -7,6 +7,7 @@
 #include "Toolkit/Widgets/Scrolling/TouchScroll.h"
 #include "Toolkit/Widgets/Tables/CellWidget.h"
 #include "Toolkit/Widgets/Tables/TableWidget.h"
+#include "Toolkit/Widgets/TouchEvent.h"
 
 #include <QContextMenuEvent>
 #include <QKeyEvent>
@@ -38,14 +39,12 @@ TableInput::TableInput(TableWidget& table) : _table(table) {
 TableInput::~TableInput() = default;
 
 bool TableInput::handle(QEvent* event) {
-    switch (event->type()) {
-    case QEvent::TouchBegin:
-    case QEvent::TouchUpdate:
-    case QEvent::TouchEnd:
-    case QEvent::TouchCancel:
-        touch(*static_cast<QTouchEvent*>(event));
+    if (const QTouchEvent* const fingers = touchEvent(event)) {
+        touch(*fingers);
         event->accept();
         return true;
+    }
+    switch (event->type()) {
     case QEvent::MouseButtonPress: {
         const auto* const mouse = static_cast<QMouseEvent*>(event);
         return mouse->button() == Qt::LeftButton && press(mouse->position().toPoint());

@@ -7,6 +7,7 @@ import random
 import socket
 import tempfile
 import threading
+import time
 import unittest
 from pathlib import Path
 from typing import Any
@@ -52,6 +53,22 @@ class CallTest(unittest.TestCase):
 
     def test_an_empty_reply_is_an_empty_dictionary(self) -> None:
         self.assertEqual(reply_with(frame(REPLY, b"", 1), {})[0], {})
+
+    def test_a_reply_that_comes_in_pieces_is_read_whole(self) -> None:
+        ours, theirs = socket.socketpair()
+        ours.settimeout(10)
+        data = frame(REPLY, plistlib.dumps({"Port": "p.1"}), 1)
+
+        def answer() -> None:
+            for part in (data[:5], data[5:30], data[30:]):
+                theirs.sendall(part)
+                time.sleep(0.02)
+
+        thread = threading.Thread(target=answer)
+        with ours, theirs:
+            thread.start()
+            self.assertEqual(call(ours, {}), {"Port": "p.1"})
+            thread.join()
 
     def test_a_closed_connection_is_no_reply(self) -> None:
         with self.assertRaisesRegex(Problem, "^no reply$"):
