@@ -86,9 +86,9 @@ public:
     /// `place`: that of the scenario after the message.
     Result<Done> append(Time time, Data message, const RoadPlace& place) {
         for (const Fix& fix : _receiver.drivenTo(place)) {
-            if (const Result<Done> written = writeUntil(fix.time); !written)
+            if (Result<Done> written = writeUntil(fix.time); !written)
                 return written;
-            if (const Result<Done> written = _writer.appendFix(fix); !written)
+            if (Result<Done> written = _writer.appendFix(fix); !written)
                 return written;
         }
         _waiting.emplace_back(time, std::move(message));
@@ -100,7 +100,7 @@ private:
     Result<Done> writeUntil(Time end) {
         for (; !_waiting.empty() && _waiting.front().first < end; _waiting.pop_front()) {
             const auto& [time, message] = _waiting.front();
-            if (const Result<Done> written = _writer.append(time, message.bytes()); !written)
+            if (Result<Done> written = _writer.append(time, message.bytes()); !written)
                 return written;
         }
         return Done{};
