@@ -10,7 +10,7 @@ build_packages=(build-essential cmake ninja-build qt6-base-dev libgl-dev libpugi
     libboost-dev libgps-dev libsqlite3-dev libthrift-dev libtomlplusplus-dev libutf8proc-dev libxxhash-dev libzstd-dev nettle-dev zlib1g-dev)
 # shellcheck disable=SC2034
 test_packages=(libgtest-dev libgmock-dev librapidcheck-dev libbenchmark-dev nlohmann-json3-dev python3 tshark gpsd gpsd-clients
-    gdal-bin libxml2-utils clang-format-14
+    gdal-bin libxml2-utils clang-format-14 jq python3-construct
     fonts-dejavu-core xvfb dbus at-spi2-core gir1.2-atspi-2.0 python3-gi desktop-file-utils appstream
     modemmanager shellcheck reuse git lintian fakeroot file systemd python3-jsonschema mandoc bash-completion tmux
     mypy python3-pandas python3-dask python3-distributed procps chromium chromium-driver firefox-esr weston qt6-wayland)

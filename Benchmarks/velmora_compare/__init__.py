@@ -1,0 +1,3 @@
+# SPDX-FileCopyrightText: 2026 Velmora contributors
+# SPDX-License-Identifier: MIT
+"""Compares decoding with other programs and with lower bounds of it."""

@@ -1,0 +1,3 @@
+# SPDX-FileCopyrightText: 2026 Velmora contributors
+# SPDX-License-Identifier: MIT
+"""Tests of what compare computes, reads and prints."""
