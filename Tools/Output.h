@@ -3,6 +3,9 @@
 
 #pragma once
 
+#include "Tools/OutputDetour.h"
+
+#include <cstdint>
 #include <string>
 #include <string_view>
 
@@ -28,7 +31,14 @@ public:
     void put(std::string_view text);
     /// Writes out everything so far.
     void flush();
+    /// Writes out everything so far and then `size` bytes of a file from `offset` on, which the system copies
+    /// without a buffer here where it can. False where the file cannot be read; not for a failed write.
+    [[nodiscard]] bool putFile(int file, std::uint64_t offset, std::uint64_t size);
 
+    /// From now on whatever is about to be written is offered to the detour, which must outlive this.
+    void setDetour(OutputDetour* detour) { _detour = detour; }
+    /// Whether no other process writes to it first.
+    [[nodiscard]] bool isFirst() const { return !_detour || _detour->isFirst(); }
     [[nodiscard]] State state() const { return _state; }
     [[nodiscard]] bool isOpen() const { return _state == State::Open; }
     /// Whether the reader has closed the pipe; polls, and writes nothing.
@@ -36,11 +46,14 @@ public:
 
 private:
     void write(std::string_view rest);
+    /// After a write or a copy has failed with that error; the state follows from it.
+    void handle(int error);
 
     int _descriptor;
     std::string _name;
     std::string _buffer;
     State _state = State::Open;
+    OutputDetour* _detour = nullptr;
 };
 
 } // namespace velmora

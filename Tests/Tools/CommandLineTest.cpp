@@ -49,7 +49,7 @@ TEST(CommandLineTest, DecodeTakesWhatLinesAndPartsAreWanted) {
     EXPECT_EQ(plain->format, DecodeOptions::Format::JsonLines);
     EXPECT_EQ(plain->every, DecodeOptions::Every::Refresh);
     EXPECT_THAT(plain->selection.paths(), testing::IsEmpty());
-    EXPECT_EQ(plain->jobs, 1U);
+    EXPECT_FALSE(plain->jobs);
     EXPECT_FALSE(plain->messages.range.from || plain->messages.range.to);
     EXPECT_THAT(plain->messages.codes, testing::IsEmpty());
     EXPECT_FALSE(plain->messages.isWarm);

@@ -9,6 +9,7 @@
 #include "Tools/Decode/CSVRows.h"
 #include "Tools/Decode/DecodeWriter.h"
 #include "Tools/Decode/Jobs/JobScheduler.h"
+#include "Tools/Decode/Jobs/UsableProcessors.h"
 #include "Tools/Decode/Paths/FileTechnologies.h"
 #include "Tools/Decode/Paths/KnownCatalogues.h"
 #include "Tools/Decode/Paths/PathCheck.h"
@@ -23,11 +24,14 @@
 #include "Tools/Report.h"
 
 #include <algorithm>
+#include <functional>
 #include <memory>
 #include <optional>
 #include <string>
 #include <utility>
 #include <vector>
+
+#include <unistd.h>
 
 namespace velmora {
 
@@ -80,8 +84,10 @@ struct Work {
     SampleColumns columns;
 };
 
-/// Decodes one file and prints it. Returns whether all of it was read.
-bool decodeFile(std::size_t index, bool showsProgress, Work& work, DecoderLines& lines, Output& output) {
+/// Decodes one file and prints it. `mayShowProgress` as ShownProgress takes it. Returns whether all of the
+/// file was read.
+bool decodeFile(std::size_t index, const std::function<bool()>& mayShowProgress, Work& work,
+                DecoderLines& lines, Output& output) {
     const DecodeOptions& options = work.options;
     const std::string& path = options.files[index];
     const std::string title = fileTitle(path);
@@ -106,8 +112,7 @@ bool decodeFile(std::size_t index, bool showsProgress, Work& work, DecoderLines&
     }
     const bool isLive = !inputSize(path);
     writer = DecodeWriter::make(options, index, isLive, work.columns, output);
-    if (showsProgress)
-        progress.emplace(**reader, path, writesAsItGoes(options));
+    progress.emplace(**reader, path, writesAsItGoes(options), mayShowProgress);
     const auto clearProgress = [&progress] {
         if (progress)
             progress->clear();
@@ -150,6 +155,20 @@ std::string headerOf(const DecodeOptions& options, const SampleColumns& columns)
     return CSVRows::header(options);
 }
 
+/// How many files are decoded at a time.
+std::size_t jobsFor(const DecodeOptions& options) {
+    const std::size_t files = options.files.size();
+    // Standard input that is named twice is read by one process: the second reader gets what is left.
+    if (files == 1 || std::count(options.files.begin(), options.files.end(), "-") > 1)
+        return 1;
+    if (options.jobs)
+        return std::min(*options.jobs, files);
+    // Several pipes may be written by one program, which fills the second one after the first.
+    const std::ptrdiff_t pipes = std::count_if(options.files.begin(), options.files.end(),
+                                               [](const std::string& file) { return !inputSize(file); });
+    return pipes > 1 ? 1 : std::min(usableProcessors(), files);
+}
+
 } // namespace
 
 int runDecode(const DecodeOptions& given, DecoderLines& lines, Output& output) {
@@ -174,20 +193,19 @@ int runDecode(const DecodeOptions& given, DecoderLines& lines, Output& output) {
         columns.add(options.selection, *catalogue);
     if (options.format == DecodeOptions::Format::Csv)
         output.put(headerOf(options, columns));
-    // Standard input that is named twice is read by one process: the second reader gets what is left.
-    const std::ptrdiff_t standardInputs = std::count(options.files.begin(), options.files.end(), "-");
-    const std::size_t jobs =
-        standardInputs > 1 || !known.areAll() ? 1 : std::min(options.jobs, options.files.size());
+    const std::size_t jobs = known.areAll() ? jobsFor(options) : 1;
     bool good = true;
     if (jobs > 1) {
+        const bool hasTerminal = ::isatty(STDERR_FILENO) != 0;
         const Job job = [&](std::size_t index, Output& part) {
-            return decodeFile(index, false, work, lines, part);
+            const auto isShown = [&] { return hasTerminal && part.isFirst(); };
+            return decodeFile(index, isShown, work, lines, part);
         };
         good = JobScheduler(options.files.size(), jobs, job, output).run();
     } else {
         try {
             for (std::size_t index = 0; index < options.files.size() && output.isOpen(); ++index)
-                good = decodeFile(index, true, work, lines, output) && good;
+                good = decodeFile(index, {}, work, lines, output) && good;
         } catch (const ImpossiblePath& impossible) {
             report(std::string("--select: ") + impossible.what());
             return ExitStatus::Usage;

@@ -130,7 +130,10 @@ CLI::App* addDecode(CLI::App& app, DecodeOptions& options) {
     command->add_flag("--strict", options.isStrict,
                       "End at a message that ends the application; by default it is counted, reported and "
                       "left out");
-    command->add_option("--jobs", options.jobs, "Decode this many files in parallel, at most 1000")
+    command
+        ->add_option(
+            "--jobs", options.jobs,
+            "Decode this many files in parallel, at most 1000; by default, as many as there are processors")
         ->check(countUpTo(maximumJobs))
         ->type_name("N");
     command->footer(

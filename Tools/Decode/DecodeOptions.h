@@ -46,7 +46,7 @@ struct DecodeOptions {
     std::string technology; ///< overrides the file's, or chooses one of several; empty for the file's
     bool isStrict = false;  ///< a message that ends the application ends decoding as well
     MaskOption mask;
-    std::size_t jobs = 1; ///< how many files are decoded in parallel
+    std::optional<std::size_t> jobs; ///< files that are decoded in parallel; absent: one a processor
     std::vector<std::string> files;
     /// Csv rows name their technology. Not an option: it follows from the files.
     bool hasTechnologyColumn = false;

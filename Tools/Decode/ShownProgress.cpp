@@ -5,13 +5,16 @@
 
 #include <cstdint>
 #include <string_view>
+#include <utility>
 
 #include <unistd.h>
 
 namespace velmora {
 
-ShownProgress::ShownProgress(const MessageReader& reader, const std::string& path, bool writesAsItGoes) {
-    if (::isatty(STDERR_FILENO) == 0)
+ShownProgress::ShownProgress(const MessageReader& reader, const std::string& path, bool writesAsItGoes,
+                             std::function<bool()> mayShow)
+    : _mayShow(std::move(mayShow)) {
+    if (!_mayShow && ::isatty(STDERR_FILENO) == 0)
         return;
     // Of a gzip'd file the offsets are no shares of its size.
     if (reader.isCompressed())
@@ -23,7 +26,10 @@ ShownProgress::ShownProgress(const MessageReader& reader, const std::string& pat
     if (!size || *size <= DecodeProgress::smallestInput)
         return;
     _line.emplace();
-    _progress.emplace(*size, _clock, [this](std::string_view text) { _line->show(text); });
+    _progress.emplace(*size, _clock, [this](std::string_view text) {
+        if (!_mayShow || _mayShow())
+            _line->show(text);
+    });
 }
 
 } // namespace velmora

@@ -8,6 +8,7 @@
 #include "Tools/Decode/DecodeProgress.h"
 #include "Tools/LogOverride.h"
 
+#include <functional>
 #include <optional>
 #include <string>
 
@@ -16,8 +17,11 @@ namespace velmora {
 /// The progress of one file on standard error, if that is a terminal and the file is long enough.
 class ShownProgress {
 public:
-    /// `writesAsItGoes`: standard output is written to while the file is read.
-    ShownProgress(const MessageReader& reader, const std::string& path, bool writesAsItGoes);
+    /// `writesAsItGoes`: standard output is written to while the file is read. `mayShow`: asked before each
+    /// line, in a process whose standard error is passed on to a terminal; without, standard error is looked
+    /// at.
+    ShownProgress(const MessageReader& reader, const std::string& path, bool writesAsItGoes,
+                  std::function<bool()> mayShow = {});
 
     /// Null where no progress is shown.
     [[nodiscard]] DecodeProgress* get() { return _progress ? &*_progress : nullptr; }
@@ -28,6 +32,7 @@ public:
     }
 
 private:
+    std::function<bool()> _mayShow;
     MachineClock _clock;
     std::optional<ProgressLine> _line;
     std::optional<DecodeProgress> _progress;

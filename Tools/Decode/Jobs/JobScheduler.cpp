@@ -21,7 +21,8 @@ constexpr std::size_t pieceSize = std::size_t{256} << 10;
 
 JobScheduler::JobScheduler(std::size_t count, std::size_t atATime, Job job, Output& output)
     : _count(count), _atATime(atATime), _job(std::move(job)), _output(output),
-      _errors(STDERR_FILENO, "standard error"), _buffer(pieceSize) {
+      _errors(STDERR_FILENO, "standard error"), _buffer(pieceSize),
+      _budget(SpoolBudget::limitIn(Spool::directory())) {
     output.flush(); // else the new processes would have a copy of it
 }
 
@@ -35,23 +36,32 @@ bool JobScheduler::run() {
             continue;
         }
         JobProcess& first = *_processes.front();
-        if (!first.becomeFirst(outlets, _buffer)) {
+        if (!first.becomeFirst(outlets) || !serveUntilEnd(first)) {
             report("what a job has written cannot be read back");
             return false;
-        }
-        while (!first.hasEnded() && _output.isOpen()) {
-            serve();
-            startMore();
         }
         if (!_output.isOpen())
             break;
         const int status = first.exitStatus();
+        if (status == JobProcess::closed)
+            break;
         if (status != ExitStatus::Done && status != JobProcess::badButOver)
             return false;
         good = good && status == ExitStatus::Done;
         _processes.pop_front();
     }
     return good;
+}
+
+/// Until the job that is first in line has ended, or the output is closed. False where its spool cannot be
+/// read back.
+bool JobScheduler::serveUntilEnd(JobProcess& first) {
+    while (!first.hasEnded() && _output.isOpen()) {
+        if (!serve())
+            return false;
+        startMore();
+    }
+    return first.finish(_output);
 }
 
 void JobScheduler::startMore() {
@@ -70,7 +80,8 @@ bool JobScheduler::start() {
             process->closeCopies();
     };
     try {
-        _processes.push_back(std::make_unique<JobProcess>(_started, _job, closeCopies));
+        _processes.push_back(
+            std::make_unique<JobProcess>(_started, _job, _processes.empty(), _output, _budget, closeCopies));
     } catch (const NoRoomForJob&) {
         return false; // another attempt follows once a process has ended
     }
@@ -78,18 +89,23 @@ bool JobScheduler::start() {
     return true;
 }
 
-/// Waits until a process has written something, or has ended, and reads that.
-void JobScheduler::serve() {
+/// Waits until a process has written an error, has stopped for its turn, or has ended, and reads that. False
+/// where the first one's spool cannot be read back.
+bool JobScheduler::serve() {
     const JobOutlets outlets{_output, _errors};
     std::vector<pollfd> watched;
     for (const auto& process : _processes)
         process->watch(watched, process == _processes.front());
     if (::poll(watched.data(), watched.size(), -1) < 0)
-        return;
+        return true;
+    bool isWhole = true;
     for (const pollfd& each : watched)
         if (each.revents != 0)
             for (const auto& process : _processes)
-                process->read(each.fd, process == _processes.front() ? &outlets : nullptr, _buffer);
+                isWhole =
+                    process->read(each.fd, process == _processes.front() ? &outlets : nullptr, _buffer) &&
+                    isWhole;
+    return isWhole;
 }
 
 } // namespace velmora

@@ -7,36 +7,41 @@
 
 #include <cstdint>
 #include <string_view>
-#include <vector>
 
 namespace velmora {
 
 class Output;
+class SpoolBudget;
 
 /// Output that is kept for later in a file without a name, in the directory of temporary files (TMPDIR or
-/// /tmp). Without such a directory, or on a file system that has no files without a name, it keeps nothing.
+/// /tmp). One process appends to it, while another moves what is there already. Without such a directory, or
+/// on a file system that has no files without a name, it keeps nothing.
 class Spool {
 public:
-    /// The size at which it is full; the last text may exceed it.
-    static constexpr std::uint64_t maximumSize = std::uint64_t{256} << 20;
+    /// `budget` must outlive it.
+    explicit Spool(SpoolBudget& budget);
 
-    Spool();
+    [[nodiscard]] static const char* directory();
 
-    /// In another process: closes its copy of the descriptor.
-    void closeCopy() { _file.reset(); }
+    /// Closes this process's copy of the descriptor; nothing is kept any more.
+    void close() { _file.reset(); }
 
-    [[nodiscard]] bool hasRoom() const { return _file.get() >= 0 && _size < maximumSize; }
+    /// Keeps what there is room for; returns the rest.
+    [[nodiscard]] std::string_view append(std::string_view text);
 
-    /// False where the file did not take all of the text; then none of it is kept.
-    [[nodiscard]] bool append(std::string_view text);
+    /// Writes what has been appended since the last time. False where the file cannot be read back.
+    [[nodiscard]] bool moveTo(Output& output);
 
-    /// Writes everything to the output and closes the file. `buffer` is used for reading. False where the
-    /// file cannot be read back.
-    [[nodiscard]] bool moveTo(Output& output, std::vector<char>& buffer);
+    /// Closes it after the last byte has been moved, or is of no use any more, and gives back its room. For
+    /// the process that moves.
+    void discard();
 
 private:
+    [[nodiscard]] std::uint64_t size() const;
+
+    SpoolBudget& _budget;
     FileDescriptor _file;
-    std::uint64_t _size = 0;
+    std::uint64_t _moved = 0;
 };
 
 } // namespace velmora

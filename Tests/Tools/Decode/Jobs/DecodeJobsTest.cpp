@@ -2,10 +2,22 @@
 // SPDX-License-Identifier: MIT
 
 #include "Tests/Tools/Decode/DecodeLinesFixture.h"
+#include "Tools/Decode/Jobs/UsableProcessors.h"
 
 #include <gmock/gmock.h>
 
 #include <algorithm>
+#include <chrono>
+#include <cstddef>
+#include <fstream>
+#include <iterator>
+#include <string>
+#include <thread>
+#include <vector>
+
+#include <fcntl.h>
+#include <sys/stat.h>
+#include <unistd.h>
 
 // `decode --jobs`: several files in parallel.
 
@@ -14,7 +26,14 @@ namespace {
 
 using testing::StartsWith;
 
-class DecodeJobsTest : public DecodeLinesTest {};
+class DecodeJobsTest : public DecodeLinesTest {
+protected:
+    /// The same, file after file.
+    static std::vector<std::string> one(std::vector<std::string> arguments) {
+        arguments.insert(arguments.end(), {"--jobs", "1"});
+        return arguments;
+    }
+};
 
 TEST_F(DecodeJobsTest, ParallelJobsPrintWhatSequentialOnesPrint) {
     writeDrive("a.pcapng");
@@ -31,7 +50,7 @@ TEST_F(DecodeJobsTest, ParallelJobsPrintWhatSequentialOnesPrint) {
         std::vector<std::string> arguments = {"decode", "--log-level", "0"};
         arguments.insert(arguments.end(), format.begin(), format.end());
         arguments.insert(arguments.end(), files.begin(), files.end());
-        ToolProcess serial(tool(arguments));
+        ToolProcess serial(tool(one(arguments)));
         EXPECT_EQ(serial.exitStatus(), 1);
         for (const char* jobs : {"2", "5", "100"}) {
             arguments.emplace_back("--jobs");
@@ -52,7 +71,7 @@ TEST_F(DecodeJobsTest, JobsGoWithoutADirectoryForTemporaryFiles) {
     writeRecording("long.pcapng", "Ostrel_GSM", std::vector<TimedMessage>(5'000, {at(0), rrState(5)}));
     ToolProcess::Setup setup = tool({"decode", "--format", "jsonl", "--every", "message", path("long.pcapng"),
                                      path("long.pcapng"), path("long.pcapng")});
-    ToolProcess serial(setup);
+    ToolProcess serial(tool(one(setup.arguments)));
     EXPECT_EQ(serial.exitStatus(), 0);
     setup.arguments.insert(setup.arguments.end(), {"--jobs", "3"});
     setup.environment["TMPDIR"] = path("no such directory");
@@ -66,7 +85,7 @@ TEST_F(DecodeJobsTest, JobsGoWithFewDescriptors) {
     std::vector<std::string> arguments = {"decode", "--format", "jsonl", "--every", "message"};
     for (int file = 0; file < 12; ++file)
         arguments.push_back(path("long.pcapng"));
-    ToolProcess serial(tool(arguments));
+    ToolProcess serial(tool(one(arguments)));
     EXPECT_EQ(serial.exitStatus(), 0);
     // With 8 there is room for a single job, with 6 for none: they are done without processes. What the
     // tests' own caller left open would not leave room for that.
@@ -132,6 +151,47 @@ TEST_F(DecodeJobsTest, StandardInputTwiceIsReadInTurn) {
     EXPECT_EQ(process.output(),
               std::string("{\"file\":\"-\",") + firstRefresh + "\n{\"file\":\"-\"," + secondRefresh + "\n");
     EXPECT_THAT(ownMessages(process.errors()), StartsWith("velmora-log: standard input: empty"));
+}
+
+TEST_F(DecodeJobsTest, ByDefaultEachUsableProcessorHasAFile) {
+    writeDrive("a.pcapng");
+    // A pipe that gets no message keeps its file from being decoded, and the program from ending.
+    const std::string pipe = path("pipe");
+    ASSERT_EQ(::mkfifo(pipe.c_str(), 0600), 0);
+    const FileDescriptor end(::open(pipe.c_str(), O_RDWR | O_CLOEXEC));
+    const std::vector<std::string> files = {pipe, path("a.pcapng")};
+    const auto processesOf = [](const ToolProcess& process) {
+        const std::string id = std::to_string(process.id());
+        std::ifstream children("/proc/" + id + "/task/" + id + "/children");
+        return std::distance(std::istream_iterator<int>(children), {});
+    };
+    const ToolProcess one(tool({"decode", "--jobs", "1", files[0], files[1]}));
+    const ToolProcess byDefault(tool({"decode", files[0], files[1]}));
+    const std::ptrdiff_t wanted = usableProcessors() > 1 ? 2 : 0;
+    for (int i = 0; i < 2000 && processesOf(byDefault) != wanted; ++i)
+        std::this_thread::sleep_for(std::chrono::milliseconds(5));
+    EXPECT_EQ(processesOf(byDefault), wanted);
+    EXPECT_EQ(processesOf(one), 0);
+}
+
+TEST_F(DecodeJobsTest, PipesAreReadInTurnByDefault) {
+    writeDrive("a.pcapng");
+    const std::string content = contentOf("a.pcapng");
+    const std::string first = path("first");
+    const std::string second = path("second");
+    ASSERT_EQ(::mkfifo(first.c_str(), 0600), 0);
+    ASSERT_EQ(::mkfifo(second.c_str(), 0600), 0);
+    ToolProcess process(tool({"decode", "--format", "json", first, second}));
+    // The writer has both open and writes the second after the first.
+    FileDescriptor one(::open(first.c_str(), O_WRONLY | O_CLOEXEC));
+    ASSERT_EQ(::write(one.get(), content.data(), content.size()), static_cast<ssize_t>(content.size()));
+    const FileDescriptor tooEarly(::open(second.c_str(), O_WRONLY | O_NONBLOCK | O_CLOEXEC));
+    EXPECT_EQ(tooEarly.get(), -1);
+    one.reset();
+    FileDescriptor two(::open(second.c_str(), O_WRONLY | O_CLOEXEC));
+    ASSERT_EQ(::write(two.get(), content.data(), content.size()), static_cast<ssize_t>(content.size()));
+    two.reset();
+    EXPECT_EQ(process.exitStatus(), 0);
 }
 
 } // namespace

@@ -14,6 +14,7 @@
 #include <iterator>
 #include <string>
 #include <thread>
+#include <vector>
 
 #include <fcntl.h>
 #include <unistd.h>
@@ -44,6 +45,24 @@ protected:
 
     static void say(const std::string& text) {
         EXPECT_EQ(::write(STDERR_FILENO, text.data(), text.size()), static_cast<ssize_t>(text.size()));
+    }
+
+    /// Runs `count` jobs side by side, whose output is a descriptor; returns whether all is written there.
+    bool runInto(int descriptor, std::size_t count, const Job& job) {
+        testing::internal::CaptureStderr();
+        bool good = false;
+        {
+            Output output(descriptor);
+            good = JobScheduler(count, count, job, output).run() && output.state() != Output::State::Failed;
+        }
+        _errors = testing::internal::GetCapturedStderr();
+        return good;
+    }
+
+    [[nodiscard]] std::string mark() const { return _directory / "mark"; }
+    void waitForMark() const {
+        for (int i = 0; i < 3000 && !std::filesystem::exists(mark()); ++i)
+            std::this_thread::sleep_for(10ms);
     }
 
     TemporaryDirectory _directory;
@@ -119,6 +138,113 @@ TEST_F(JobSchedulerTest, MoreThanPipesHoldIsKeptForLater) {
     EXPECT_TRUE(_output ==
                 "head\n" + std::string(size, 'a') + std::string(size, 'b') + std::string(size, 'c'));
     EXPECT_TRUE(_errors == std::string(size, 'A') + std::string(size, 'B') + std::string(size, 'C'));
+}
+
+TEST_F(JobSchedulerTest, FirstJobWritesToTheOutputItself) {
+    const Job job = [this](std::size_t index, Output& output) {
+        output.put("text");
+        output.flush();
+        // No other process has had to do anything for it.
+        return index != 0 || std::filesystem::file_size(_directory / "output") == 9;
+    };
+    EXPECT_TRUE(run(2, 2, job));
+    EXPECT_EQ(_output, "head\ntexttext");
+}
+
+TEST_F(JobSchedulerTest, JobWhoseTurnComesGoesOnByItself) {
+    const Job job = [this](std::size_t index, Output& output) {
+        if (index == 0) {
+            waitForMark(); // the second has kept something by then
+            output.put("first ");
+            return true;
+        }
+        output.put("second ");
+        output.flush();
+        std::ofstream(mark()).put('x');
+        for (int i = 0; i < 3000 && !output.isFirst(); ++i)
+            std::this_thread::sleep_for(10ms);
+        output.put("waits ");
+        output.flush();
+        output.put("and writes");
+        output.flush();
+        return std::filesystem::file_size(_directory / "output") == 34;
+    };
+    EXPECT_TRUE(run(2, 2, job));
+    EXPECT_EQ(_output, "head\nfirst second waits and writes");
+}
+
+TEST_F(JobSchedulerTest, JobThatIsKilledAfterItsTurnHasComeLosesNothing) {
+    const Job job = [](std::size_t index, Output& output) {
+        if (index == 0)
+            return true;
+        output.put("kept ");
+        output.flush();
+        for (int i = 0; i < 3000 && !output.isFirst(); ++i)
+            std::this_thread::sleep_for(1ms);
+        output.put("written");
+        output.flush();
+        ::raise(SIGKILL);
+        return true;
+    };
+    EXPECT_FALSE(run(2, 2, job));
+    EXPECT_EQ(_output, "head\nkept written");
+}
+
+TEST_F(JobSchedulerTest, KeptOutputGoesThroughAPipe) {
+    int ends[2];
+    ASSERT_EQ(::pipe2(ends, O_CLOEXEC), 0);
+    const FileDescriptor reading(ends[0]);
+    FileDescriptor writing(ends[1]);
+    std::string text;
+    std::thread reader([&] {
+        std::vector<char> buffer(1 << 16);
+        while (const ssize_t count = ::read(reading.get(), buffer.data(), buffer.size()))
+            text.append(buffer.data(), static_cast<std::size_t>(count));
+    });
+    constexpr std::size_t size = 300'001;
+    const Job job = [](std::size_t index, Output& output) {
+        output.put(std::string(size, static_cast<char>('a' + index)));
+        return true;
+    };
+    EXPECT_TRUE(runInto(writing.get(), 3, job));
+    writing.reset();
+    reader.join();
+    EXPECT_TRUE(text == std::string(size, 'a') + std::string(size, 'b') + std::string(size, 'c'));
+}
+
+TEST_F(JobSchedulerTest, ClosedReaderEndsAllJobsWithoutAnError) {
+    for (const std::size_t writer : {0U, 1U}) {
+        int ends[2];
+        ASSERT_EQ(::pipe2(ends, O_CLOEXEC), 0);
+        ::close(ends[0]);
+        const FileDescriptor writing(ends[1]);
+        const auto handler = std::signal(SIGPIPE, SIG_IGN);
+        const Job job = [writer](std::size_t index, Output& output) {
+            if (index == writer)
+                output.put("text");
+            if (index == 2)
+                std::this_thread::sleep_for(60s);
+            return true;
+        };
+        const auto started = std::chrono::steady_clock::now();
+        EXPECT_TRUE(runInto(writing.get(), 3, job));
+        std::signal(SIGPIPE, handler);
+        EXPECT_LT(std::chrono::steady_clock::now() - started, 30s);
+        EXPECT_EQ(_errors, "");
+    }
+}
+
+TEST_F(JobSchedulerTest, FailedWriteIsReportedOnceAndEndsAllJobs) {
+    for (const std::size_t writer : {0U, 1U}) {
+        const FileDescriptor full(::open("/dev/full", O_WRONLY | O_CLOEXEC));
+        const Job job = [writer](std::size_t index, Output& output) {
+            if (index >= writer)
+                output.put("text");
+            return true;
+        };
+        EXPECT_FALSE(runInto(full.get(), 3, job));
+        EXPECT_EQ(_errors, "velmora-log: cannot write standard output: No space left on device\n");
+    }
 }
 
 } // namespace
