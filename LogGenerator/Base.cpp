@@ -13,6 +13,23 @@
 
 namespace velmora {
 
+namespace {
+
+bool isContainer(const Value& value) {
+    return value.asDictionary() || value.asArray();
+}
+
+/// Whether a node as the template has it, or an earlier decoder left it, holds further nodes.
+bool holdsNodes(const Value& node) {
+    if (const Dictionary* const dictionary = node.asDictionary())
+        return std::any_of(dictionary->begin(), dictionary->end(),
+                           [](const Dictionary::Entry& entry) { return isContainer(entry.value); });
+    const Array* const array = node.asArray();
+    return array && std::any_of(array->begin(), array->end(), isContainer);
+}
+
+} // namespace
+
 Base* Base::initWithDict(ClassDictionary& classDict, CodeDictionary& codeDict) {
     classDict.insert_or_assign(std::string(getSectionName()), this);
     updateLogCodeDict(codeDict);
@@ -31,6 +48,7 @@ void Base::updateSectionRef(const Value& node) {
     _dictionaryRef.assign(node.dictionaryRef());
     _arrayRef.assign(node.arrayRef());
     _views = views();
+    _showsOwnRecordsOnly = !holdsNodes(node);
     _records.clear();
     _records.resize(_views.size());
     logLine(LogPriority::Warning, getSectionName());
@@ -125,6 +143,11 @@ void Base::writeNode() {
     } else {
         _records.clear();
     }
+}
+
+void Base::nameLatest(FieldVisitor& visitor) const {
+    const std::size_t view = _records.latest();
+    decode(_views[view], Record(Bytes(_records[view].bytes)), visitor);
 }
 
 void Base::writeInto(Array& node) {

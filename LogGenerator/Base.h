@@ -85,6 +85,18 @@ public:
     [[nodiscard]] Value node();
     /// Writes what has arrived and is not in the node yet.
     void writeNode();
+    [[nodiscard]] bool hasNode() const { return _dictionaryRef.get() || _arrayRef.get(); }
+
+    // For those who keep what the node shows in a form of their own, and so need no node.
+
+    /// Whether the node shows nothing but what `decode` has named to a DisplayWriter, and the texts of its
+    /// template: it holds no other section.
+    [[nodiscard]] bool showsOwnRecordsOnly() const { return _showsOwnRecordsOnly; }
+    /// A number that stays while the node shows the same, and is one more after a record was kept. Any other
+    /// is that of more records, or of another node.
+    [[nodiscard]] std::uint64_t changes() const { return _records.changes(); }
+    /// Names the fields of the record that was kept last. Precondition: there has been one.
+    void nameLatest(FieldVisitor& visitor) const;
     /// Appends this section to the subscribers of each of its codes: a code listed twice is subscribed twice.
     void updateLogCodeDict(CodeDictionary& codeDict);
 
@@ -174,6 +186,7 @@ private:
     WatchedNode<Dictionary> _dictionaryRef;
     WatchedNode<Array> _arrayRef;
     std::span<const View> _views; ///< as `views` returns them, since there has been a node
+    bool _showsOwnRecordsOnly = false;
     KeptRecords _records;
     DisplayWriter::SpareRows _spareRows;
     Observer* _observer = nullptr;

@@ -10,6 +10,7 @@ void KeptRecords::clear() {
         kept.order = 0;
         kept.shown = 0;
     }
+    _lastOrder += 2; // no record does that: see changes()
 }
 
 std::size_t KeptRecords::earliest() const {

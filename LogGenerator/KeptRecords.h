@@ -51,6 +51,7 @@ public:
         std::copy(bytes.begin(), bytes.end(), kept.bytes.begin());
         kept.parts = parts;
         kept.order = ++_lastOrder;
+        _latest = view;
         return (parts & ~kept.shown) != 0;
     }
     /// Nothing is pending but, perhaps, this view: it replaces what the others would write.
@@ -61,6 +62,12 @@ public:
     }
     /// Nothing is pending, and nothing has been written: the display is another.
     void clear();
+
+    /// A number that is one more after each kept record, and another, but never by one, after `clear`.
+    [[nodiscard]] std::uint64_t changes() const { return _lastOrder; }
+    /// The view of the record that was kept last, whether or not it has been written. Precondition: there has
+    /// been one.
+    [[nodiscard]] std::size_t latest() const { return _latest; }
 
     /// Calls `write(view, bytes)` for each pending record in the order of arrival. One whose writing throws
     /// stays pending with those after it.
@@ -81,6 +88,7 @@ private:
 
     std::vector<Kept> _kept;
     std::uint64_t _lastOrder = 0;
+    std::size_t _latest = 0;
 };
 
 } // namespace velmora

@@ -83,8 +83,7 @@ void OstrelLogGenerator2::updateStateReporting(Dictionary& state, const Data& da
     for (auto section = subscribers->begin(); section != subscribers->end(); ++section)
         // A section that lists a code twice is called twice and reported once.
         if (std::find(subscribers->begin(), section, *section) == section)
-            if (const Value node = (*section)->node(); !node.isNone())
-                effects.section((*section)->getSectionName(), node);
+            effects.concerned(**section);
 }
 
 void OstrelLogGenerator2::updateWithData(const Data& message) {

@@ -165,8 +165,9 @@ void C2KLogGenerator::decode(const Data& data, const std::optional<LogMessage>& 
         observer()->damaged(Damage::TooShort);
     if (reading) {
         if (effects) {
-            EffectsVisitor visitor(*effects);
-            parser->decode(*reading, visitor);
+            EffectsVisitor reporting(*effects);
+            FieldVisitor* const direct = effects->valueVisitor();
+            parser->decode(*reading, direct ? *direct : reporting);
         }
         // No parser removes what records of another code show.
         if (Observer* const observing = observer(); observing && _fieldMap.hasCode(message->logCode()))

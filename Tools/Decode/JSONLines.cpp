@@ -3,6 +3,7 @@
 
 #include "Tools/Decode/JSONLines.h"
 
+#include "LogGenerator/Base.h"
 #include "Tools/Text/JSONText.h"
 
 #include <algorithm>
@@ -68,6 +69,7 @@ MessageLines::MessageLines(Output& output, bool isLive, const NodeSelection& sel
     : LineWriter(output, isLive), _selection(selection), _begin(beginOf(file)) {}
 
 void MessageLines::didMakeDecoder(LogGenerator& decoder) {
+    _sections.clear();
     if (_selection.paths().empty())
         return;
     const Catalogue& catalogue = decoder.catalogue();
@@ -90,6 +92,8 @@ void MessageLines::willConcern(const Decoded& decoded) {
 }
 
 void MessageLines::didDecode(const LoggedMessage&, LogGenerator&, Dictionary&) {
+    if (_valueWriter)
+        endValues();
     if (_current && _first)
         dropLine();
     else
@@ -102,10 +106,40 @@ void MessageLines::sections(std::optional<std::uint32_t> code) {
     line().append(",\"sections\":{");
 }
 
+void MessageLines::concerned(Base& section) {
+    if (_current) {
+        MessageEffects::concerned(section);
+        return;
+    }
+    if (!section.hasNode())
+        return;
+    if (!_first)
+        line().append(',');
+    _first = false;
+    _sections.try_emplace(&section, section).first->second.append(line());
+}
+
 void MessageLines::values(std::optional<std::uint32_t> code) {
     begin();
     appendCode(code);
     line().append(",\"values\":{");
+    _code = code.value_or(0);
+    _valueWriter.reset();
+}
+
+FieldVisitor* MessageLines::valueVisitor() {
+    if (_current)
+        return nullptr;
+    JSONNode& node = _values.try_emplace(_code, false).first->second;
+    return &_valueWriter.emplace(node, JSONFieldWriter::Into::Values);
+}
+
+void MessageLines::endValues() {
+    _valueWriter->end();
+    _valueWriter.reset();
+    line().truncate(line().size() - 1); // the node has its own brackets
+    _values.at(_code).append(line());
+    _end = "}\n";
 }
 
 void MessageLines::display(const Value& display) {

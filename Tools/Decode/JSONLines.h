@@ -4,11 +4,15 @@
 #pragma once
 
 #include "Tools/Decode/FreshValues.h"
+#include "Tools/Decode/Lines/JSONFieldWriter.h"
+#include "Tools/Decode/Lines/SectionText.h"
 #include "Tools/Text/LineWriter.h"
 
 #include <functional>
 #include <map>
+#include <optional>
 #include <string>
+#include <unordered_map>
 #include <vector>
 
 namespace velmora {
@@ -43,12 +47,16 @@ public:
 
 private:
     void sections(std::optional<std::uint32_t> code) override;
+    void concerned(Base& section) override;
     void section(std::string_view name, const Value& node) override { selectedMember(name, node); }
     void values(std::optional<std::uint32_t> code) override;
+    [[nodiscard]] FieldVisitor* valueVisitor() override;
     void value(std::string_view key, const Value& value) override { selectedMember(key, value); }
     void display(const Value& display) override;
 
     void begin();
+    /// Appends the values that were named to `valueVisitor`.
+    void endValues();
     void appendCode(std::optional<std::uint32_t> code);
     void member(std::string_view name, const Value& value);
     /// What of a section or value is selected, if anything is.
@@ -60,6 +68,10 @@ private:
     const NodeSelection& _selection;
     std::map<std::string, Places, std::less<>> _places; ///< by technology; with a selection only
     const Places* _current = nullptr;
+    std::unordered_map<const Base*, SectionText> _sections;
+    std::unordered_map<std::uint32_t, JSONNode> _values; ///< of each code, as its latest message published
+    std::uint32_t _code = 0;                             ///< of the values of this message
+    std::optional<JSONFieldWriter> _valueWriter;         ///< while they are named
     std::string _begin;
     std::string _technology; ///< the member, from the quote after the time on to that before the next comma
     Time _moment{};

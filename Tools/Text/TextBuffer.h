@@ -16,11 +16,17 @@ namespace velmora {
 /// it has written the longest.
 class TextBuffer {
 public:
+    /// `smallest`: the storage that there is from the first character on.
+    explicit TextBuffer(std::size_t smallest = 1024) : _smallest(smallest) {}
+
     [[nodiscard]] std::string_view view() const { return {_characters.get(), _size}; }
     [[nodiscard]] std::size_t size() const { return _size; }
     void clear() { _size = 0; }
     /// Precondition: `size` is not above size().
     void truncate(std::size_t size) { _size = size; }
+
+    /// Precondition: `index` is below size().
+    void replace(std::size_t index, char character) { _characters[index] = character; }
 
     void append(char character) {
         *room(1) = character;
@@ -42,8 +48,7 @@ public:
 
 private:
     void grow(std::size_t count) {
-        constexpr std::size_t smallest = 1024;
-        const std::size_t capacity = std::max(smallest, std::max(2 * _capacity, _size + count));
+        const std::size_t capacity = std::max(_smallest, std::max(2 * _capacity, _size + count));
         auto characters = std::make_unique<char[]>(capacity);
         if (_size > 0)
             std::memcpy(characters.get(), _characters.get(), _size);
@@ -54,6 +59,7 @@ private:
     std::unique_ptr<char[]> _characters;
     std::size_t _size = 0;
     std::size_t _capacity = 0;
+    std::size_t _smallest;
 };
 
 } // namespace velmora
