@@ -32,11 +32,11 @@ private:
 
 } // namespace
 
-Result<std::unique_ptr<PlayedFile>> PlayedFile::open(const std::string& path) {
+Result<std::unique_ptr<PlayedFile>> PlayedFile::open(const std::string& path, Wrapping wrapping) {
     Result<std::shared_ptr<SharedFile>> file = SharedFile::open(path);
     if (!file)
         return Failure{file.reason()};
-    std::unique_ptr<PlayedFile> played(new PlayedFile(path, *std::move(file)));
+    std::unique_ptr<PlayedFile> played(new PlayedFile(path, *std::move(file), std::move(wrapping)));
     Result<std::unique_ptr<MessageReader>> reader = openMessages(ChunkedInput(
         std::make_unique<CountedSource>(SharedFile::from(played->_file, 0), played->_bytesRead)));
     if (!reader)
@@ -45,6 +45,8 @@ Result<std::unique_ptr<PlayedFile>> PlayedFile::open(const std::string& path) {
     played->_reader->setReadsAllTechnologies(true);
     if (!played->_reader->isCompressed())
         played->_recording = dynamic_cast<PcapngReader*>(played->_reader.get());
+    if (played->_wrapping)
+        played->_reader = played->_wrapping(std::move(played->_reader));
     if (played->_recording)
         return played;
     Result<std::unique_ptr<MessageSpool>> spool = MessageSpool::create();
@@ -89,7 +91,7 @@ Result<std::unique_ptr<MessageReader>> PlayedFile::from(const MessagePlace& plac
         ChunkedInput(SharedFile::from(_file, offset), ChunkedInput::defaultChunkSize, offset),
         *place.recording);
     reader->setReadsAllTechnologies(true);
-    return reader;
+    return _wrapping ? _wrapping(std::move(reader)) : std::move(reader);
 }
 
 double PlayedFile::progress() const {

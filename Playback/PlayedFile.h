@@ -9,9 +9,11 @@
 #include "Recording/Pcapng/PcapngReader.h"
 
 #include <cstdint>
+#include <functional>
 #include <memory>
 #include <optional>
 #include <string>
+#include <utility>
 
 namespace velmora {
 
@@ -26,8 +28,13 @@ struct MessagePlace {
 /// read first. Main thread only.
 class PlayedFile {
 public:
-    /// Opens a regular file of any form that openMessages reads; the reason does not repeat the path.
-    static Result<std::unique_ptr<PlayedFile>> open(const std::string& path);
+    /// Makes of a reader of the file one that returns its messages otherwise, such as masked. It must read no
+    /// further than the message that it returns, and return the same ones in each reading.
+    using Wrapping = std::function<std::unique_ptr<MessageReader>(std::unique_ptr<MessageReader>)>;
+
+    /// Opens a regular file of any form that openMessages reads; the reason does not repeat the path. What is
+    /// spooled has been wrapped.
+    static Result<std::unique_ptr<PlayedFile>> open(const std::string& path, Wrapping wrapping = {});
 
     /// The next message of the first reading; none at the end, and where it fails (see `failure`).
     [[nodiscard]] std::optional<LoggedMessage> next();
@@ -48,14 +55,15 @@ public:
     [[nodiscard]] std::string change() const { return _file->change(); }
 
 private:
-    PlayedFile(std::string path, std::shared_ptr<SharedFile> file)
-        : _path(std::move(path)), _file(std::move(file)) {}
+    PlayedFile(std::string path, std::shared_ptr<SharedFile> file, Wrapping wrapping)
+        : _path(std::move(path)), _file(std::move(file)), _wrapping(std::move(wrapping)) {}
 
     std::string _path;
     std::shared_ptr<SharedFile> _file;
+    Wrapping _wrapping; ///< empty for messages as they are
     std::shared_ptr<std::uint64_t> _bytesRead = std::make_shared<std::uint64_t>(0);
     std::unique_ptr<MessageReader> _reader;
-    PcapngReader* _recording = nullptr; ///< the reader, where it can begin at a place
+    PcapngReader* _recording = nullptr; ///< the reader, or what it wraps, where that can begin at a place
     std::unique_ptr<MessageSpool> _spool;
     std::string _spoolFailure;
 };

@@ -6,9 +6,11 @@
 #include "Export/Masking/MessageMask.h"
 #include "Recording/MessageReader.h"
 
+#include <memory>
 #include <optional>
 #include <string>
 #include <string_view>
+#include <utility>
 #include <vector>
 
 namespace velmora {
@@ -20,6 +22,11 @@ public:
     /// `forChain`: messages whose end a reader of records without framing would not find are left out.
     MaskedReader(MessageReader& reader, MessageMask& mask, std::string technology = {}, bool forChain = false)
         : _reader(reader), _mask(mask), _override(std::move(technology)), _isForChain(forChain) {}
+    /// The same of a reader that it owns.
+    MaskedReader(std::unique_ptr<MessageReader> reader, MessageMask& mask, std::string technology)
+        : MaskedReader(*reader, mask, std::move(technology)) {
+        _owned = std::move(reader);
+    }
 
     [[nodiscard]] std::optional<LoggedMessage> next() override;
     [[nodiscard]] const std::string& technology() const override { return _reader.technology(); }
@@ -31,6 +38,7 @@ public:
 private:
     void addLosses();
 
+    std::unique_ptr<MessageReader> _owned; ///< null where it outlives this
     MessageReader& _reader;
     MessageMask& _mask;
     std::string _override;

@@ -5,6 +5,7 @@
 
 #include "Recording/Pcapng/Pcapng.h"
 #include "Recording/Pcapng/PcapngBlocks.h"
+#include "Recording/Positions/NMEASentence.h"
 
 #include <algorithm>
 #include <system_error>
@@ -33,9 +34,10 @@ std::uint32_t MaskedRecording::interfaceOf(std::string_view technology) {
     return index;
 }
 
-Result<Done> MaskedRecording::add(Time time, Bytes message, std::string_view technology) {
+Result<Done> MaskedRecording::add(Time time, Bytes message, std::string_view technology,
+                                  std::span<const std::string> comments) {
     _digest.add(technology, message);
-    pcapngBlocks::appendPacket(_buffer, time, message, interfaceOf(technology));
+    pcapngBlocks::appendPacket(_buffer, time, message, interfaceOf(technology), comments);
     return _buffer.size() < flushThreshold ? Result<Done>(Done{}) : flush();
 }
 
@@ -51,6 +53,15 @@ void MaskedRecording::addSentence(Time time, std::string_view sentence) {
     }
     pcapngBlocks::appendPacket(
         _buffer, time, Bytes(reinterpret_cast<const std::uint8_t*>(sentence.data()), sentence.size()), index);
+}
+
+void MaskedRecording::addSentencesOf(MessageReader& reader) {
+    // A sentence without a kind is a maker's own, and may hold the receiver's number.
+    if (_seal.level != MaskLevel::All)
+        reader.setSentences([this](const PositionSentence& each) {
+            if (const auto sentence = NMEASentence::parse(each.text); sentence && !sentence->kind().empty())
+                addSentence(each.time, each.text);
+        });
 }
 
 Result<Done> MaskedRecording::finish(std::string_view technology) {

@@ -7,10 +7,12 @@
 #include "Platform/Clock.h"
 #include "Platform/Result.h"
 #include "Recording/Files/OutputFile.h"
+#include "Recording/MessageReader.h"
 
 #include <cstdint>
 #include <memory>
 #include <optional>
+#include <span>
 #include <string>
 #include <string_view>
 #include <vector>
@@ -25,14 +27,18 @@ public:
     /// Failures name the file `name`. `seal`: without a digest.
     MaskedRecording(std::unique_ptr<OutputFile> file, std::string name, MaskSeal seal);
 
-    /// `technology`: a short name. Precondition: the message is not above `maximumMessageSize`.
-    Result<Done> add(Time time, Bytes message, std::string_view technology);
-    /// Adds a sentence of the receiver of positions; nothing before the first message.
-    void addSentence(Time time, std::string_view sentence);
+    /// `technology`: a short name; `comments`: on the message, which are not masked and which the seal does
+    /// not cover. Precondition: the message is not above `maximumMessageSize`.
+    Result<Done> add(Time time, Bytes message, std::string_view technology,
+                     std::span<const std::string> comments = {});
+    /// Adds the sentences of the receiver of positions that the reader passes on from now on and that the
+    /// seal's level keeps; nothing before the first message. The reader may not be read any more afterwards.
+    void addSentencesOf(MessageReader& reader);
     /// Writes what is left. `technology`: of the interface where there was no message.
     Result<Done> finish(std::string_view technology);
 
 private:
+    void addSentence(Time time, std::string_view sentence);
     [[nodiscard]] std::uint32_t interfaceOf(std::string_view technology);
     Result<Done> flush();
 

@@ -245,7 +245,7 @@ _velmora_log() {
         return
         ;;
     decode) options+=(--format --every --samples --wide --positions --max-gap --safe --max-age --select --from --to --code --warm --technology --mask --key --strict --jobs) ;;
-    browse) options+=(--line --technology) ;;
+    browse) options+=(--line --technology --mask --key) ;;
     watch) options+=(--once --timeout --bell --mask --key) ;;
     record) options+=(--force --duration --count --timeout --gps) ;;
     convert) options+=(--force --from --to --code --technology --description --strict --track --select --role --max-gap) ;;

@@ -43,9 +43,14 @@ private:
 
 int runBrowse(const BrowseOptions& options, Output& output) {
     returnLargeAllocations();
+    const Result<std::optional<MaskOptions>> masking = maskOptionsOf(options.mask);
+    if (!masking) {
+        report(masking.reason());
+        return ExitStatus::BadInput;
+    }
     LazyRules rules;
     const Browser::Open open = [&](const std::string& path) {
-        return BrowseSession::open(path, options.technology,
+        return BrowseSession::open(path, options.technology, *masking,
                                    [&rules]() -> const RuleSet& { return rules.get(); });
     };
     if (options.byLine)

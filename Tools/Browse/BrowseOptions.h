@@ -3,6 +3,8 @@
 
 #pragma once
 
+#include "Tools/Mask/MaskOption.h"
+
 #include <string>
 #include <vector>
 
@@ -17,6 +19,7 @@ struct BrowseOptions {
     std::vector<std::string> files;
     std::string technology; ///< short name; empty for the first of each file
     bool byLine = false;    ///< lines of text in place of a screen
+    MaskOption mask;
 };
 
 /// Adds the command with its options, help and examples. Parsing fills `options`, which must outlive `app`.

@@ -24,8 +24,10 @@ std::string percent(std::uint64_t done, std::uint64_t all) {
 } // namespace
 
 Result<std::unique_ptr<BrowseSession>> BrowseSession::open(const std::string& path,
-                                                           const std::string& technology, Rules rules) {
-    Result<std::unique_ptr<BrowsedFile>> file = BrowsedFile::open(path, technology);
+                                                           const std::string& technology,
+                                                           const std::optional<MaskOptions>& masking,
+                                                           Rules rules) {
+    Result<std::unique_ptr<BrowsedFile>> file = BrowsedFile::open(path, technology, masking);
     if (!file)
         return Failure{file.reason()};
     return std::unique_ptr<BrowseSession>(new BrowseSession(*std::move(file), std::move(rules)));
@@ -267,6 +269,7 @@ Result<std::uint64_t> BrowseSession::write(const std::string& path) {
     copy.output = path;
     copy.technology = _file->index().technology();
     copy.notes = _notes;
+    copy.masking = _file->masking();
     if (const auto range = marked()) {
         copy.first = range->first;
         copy.last = range->second;

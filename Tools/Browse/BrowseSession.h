@@ -30,6 +30,7 @@ public:
     using Rules = std::function<const RuleSet&()>;
 
     static Result<std::unique_ptr<BrowseSession>> open(const std::string& path, const std::string& technology,
+                                                       const std::optional<MaskOptions>& masking,
                                                        Rules rules);
 
     /// Goes on with what is going on, for some milliseconds. Whether there is more to do.

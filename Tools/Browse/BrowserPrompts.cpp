@@ -1,6 +1,7 @@
 // SPDX-FileCopyrightText: 2026 Velmora contributors
 // SPDX-License-Identifier: MIT
 
+#include "Export/Masking/MaskKey.h"
 #include "Platform/PrintableText.h"
 #include "Tools/Browse/BrowseTime.h"
 #include "Tools/Browse/Browser.h"
@@ -77,11 +78,7 @@ void Browser::copy() {
         const DisplayRow& row = message->rows.at(displayRow(*message));
         text = row.isBranch ? row.path : row.path + " = " + row.value;
     } else if (_part == BrowsePart::Content) {
-        constexpr const char* digits = "0123456789abcdef";
-        for (const std::uint8_t byte : message->message.message.bytes()) {
-            text += digits[byte >> 4];
-            text += digits[byte & 15];
-        }
+        text = hexadecimalText(message->message.message.bytes());
     } else if (const std::vector<MessageRow> rows = session().rows(session().chosen(), 1); !rows.empty()) {
         text = rowText(rows.front());
         text.erase(0, text.find_first_not_of(" |"));

@@ -55,6 +55,8 @@ BrowseView Browser::view(ScreenSize size) {
     BrowseView view;
     view.part = _part;
     view.title = printable(_files[_file]) + "  " + printable(shown.file().index().technology());
+    if (const std::optional<MaskOptions> masking = shown.file().masking())
+        view.title += "  masked: " + std::string(nameOf(masking->level));
     if (_files.size() > 1)
         view.title += "  file " + std::to_string(_file + 1) + " of " + std::to_string(_files.size());
     const std::uint64_t listed = shown.listed();

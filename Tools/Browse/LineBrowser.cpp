@@ -3,6 +3,7 @@
 
 #include "Tools/Browse/LineBrowser.h"
 
+#include "Export/Masking/MaskKey.h"
 #include "Platform/PrintableText.h"
 #include "Tools/Browse/BrowseTime.h"
 #include "Tools/Browse/Screen/RowText.h"
@@ -19,7 +20,8 @@ namespace {
 
 constexpr std::string_view help =
     "an empty line: the next message   b: the one before   NUMBER: that message   $: the last one\n"
-    "c: what the message changed   d: the display   x: its fields and where they lie   l: events\n"
+    "c: what the message changed   d: the display   x: its fields and where they lie   h: its bytes   "
+    "l: events\n"
     "/TEXT: search, n: again, N: backwards   f CONDITION or CODES: filter, f alone: all\n"
     "e, E: next, previous event   t TIME: go there   m TEXT: a note, m alone: none\n"
     "v: begin or drop a range   w FILE: write it to a new recording\n"
@@ -46,7 +48,7 @@ bool LineBrowser::openFile(std::size_t index) {
     _file = index;
     finishWork();
     print(printable(_files[_file]) + ": " + std::to_string(_session->listed()) + " messages, " +
-          printable(_session->file().index().technology()));
+          printable(_session->file().index().technology()) + (_session->file().masking() ? ", masked" : ""));
     printMessage();
     return true;
 }
@@ -85,6 +87,7 @@ bool LineBrowser::take(std::string_view line) {
     case 'c': printDisplay(true); return true;
     case 'd': printDisplay(false); return true;
     case 'x': printFields(); return true;
+    case 'h': printBytes(); return true;
     case 'l': printEvents(); return true;
     case '/': find(rest, Direction::Forward); break;
     case 'n': find(_query, Direction::Forward); break;
@@ -170,6 +173,11 @@ void LineBrowser::printFields() {
         return;
     for (const ReportedField& field : message->fields)
         print(printable(fieldText(field)));
+}
+
+void LineBrowser::printBytes() {
+    if (const InspectedMessage* const message = _session->message())
+        print(hexadecimalText(message->message.message.bytes()));
 }
 
 void LineBrowser::printEvents() {

@@ -34,6 +34,7 @@ private:
     void printMessage();
     void printDisplay(bool changesAlone);
     void printFields();
+    void printBytes();
     void printEvents();
     void print(std::string_view line);
     void print(const Result<Done>& result);

@@ -12,7 +12,6 @@
 #include "PropertyLists/PropertyList.h"
 #include "Recording/Files/DescriptorFile.h"
 #include "Recording/OpenMessages.h"
-#include "Recording/Positions/NMEASentence.h"
 #include "Tools/Convert/Conversion.h"
 #include "Tools/Messages/TechnologyChoice.h"
 #include "Tools/Report.h"
@@ -38,12 +37,7 @@ Result<bool> toRecording(MessageReader& reader, const TechnologyChoice& choice, 
     MaskedRecording recording(std::make_unique<DescriptorFile>(descriptor, false), name,
                               sealOf(mask.options()));
     reader.setReadsAllTechnologies(choice.override.empty());
-    // A sentence without a kind is a maker's own, and may hold the receiver's number.
-    if (mask.options().level != MaskLevel::All)
-        reader.setSentences([&recording](const PositionSentence& each) {
-            if (const auto sentence = NMEASentence::parse(each.text); sentence && !sentence->kind().empty())
-                recording.addSentence(each.time, each.text);
-        });
+    recording.addSentencesOf(reader);
     std::vector<std::string> names;
     while (const std::optional<LoggedMessage> read = reader.next()) {
         if (choice.only && read->technology != *choice.only)

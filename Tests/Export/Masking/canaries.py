@@ -9,7 +9,8 @@ Shares nothing with the masked program: it reads and writes the blocks of a reco
 itself. Planted are the identities that SIM files, contexts, displays and a live modem's messages have, under the keys
 of these and under unknown keys; in records of unknown codes, behind the end of known ones and in bytes that no
 field is read from; in malformed messages; and in comments, options, host names and unknown blocks of the recording.
-Each is searched for in eight encodings and as a number. Exit status: 0 nothing found, 1 something found or a command failed, 2 usage.
+Each is searched for in eight encodings and as a number, in masked files and, of the first seed, in all that `browse --mask`
+shows and writes. Exit status: 0 nothing found, 1 something found or a command failed, 2 usage.
 """
 
 from __future__ import annotations
@@ -306,7 +307,7 @@ class Search:
         return [f"{name}: {value} found: {encoding}" for value, encoding, form in self.forms if form in joined]
 
 
-def check(log: Path, drive: Path, scenario: str, seed: int, folder: Path) -> list[str]:
+def check(log: Path, drive: Path, scenario: str, seed: int, first: int, folder: Path) -> list[str]:
     original, planted = folder / "drive.pcapng", folder / "planted.pcapng"
     run(drive, scenario, str(seed), str(MESSAGES[scenario]), original)
     planter = Planter(scenario, seed)
@@ -332,7 +333,28 @@ def check(log: Path, drive: Path, scenario: str, seed: int, folder: Path) -> lis
                          "--known", known)
             if any(value in output for value in values):
                 problems.append(f"{name}: --check prints a value")
+        if seed == first:
+            for part, content in browsed(log, planted, TECHNOLOGIES[scenario], level, folder):
+                problems += search(f"{scenario} {seed}, {level}, browse, {part}", content)
     return problems
+
+
+def browsed(log: Path, planted: Path, technology: str, level: str, folder: Path) -> list[tuple[str, bytes]]:
+    """What `browse --mask` prints of every message, the bytes that it prints, and what it writes."""
+    count = len(packets_of(planted.read_bytes()))
+    copy = folder / "browsed.pcapng"
+    copy.unlink(missing_ok=True)
+    # A note needs comments to be copied; the search goes through the values of all messages.
+    commands = ["m seen", *["c", "d", "x", "h", ""] * count, "l", "1", "/no message has this", f"w {copy}"]
+    done = subprocess.run([log, "--log-level", "0", "browse", "--line", f"--mask={level}", "--technology", technology, planted],
+                          input="\n".join(commands) + "\n", capture_output=True, text=True, check=False)
+    if done.returncode != 0 or not copy.exists():
+        raise SystemExit(f"browse --mask={level} of {technology}: {done.stdout[-1000:]}{done.stderr}")
+    lines = done.stdout.splitlines()
+    contents = [bytes.fromhex(line) for line in lines if re.fullmatch("(?:[0-9a-f]{2})+", line)]
+    if len(contents) < count // 2:
+        raise SystemExit(f"browse --mask={level} of {technology} shows the bytes of {len(contents)} of {count} messages")
+    return [("screen", done.stdout.encode()), ("bytes", (b"\xaa" * 64).join(contents)), ("copy", copy.read_bytes())]
 
 
 def main() -> int:
@@ -347,7 +369,7 @@ def main() -> int:
     with tempfile.TemporaryDirectory() as folder:
         for scenario in options.scenario or TECHNOLOGIES:
             for seed in range(options.first, options.first + options.seeds):
-                problems += check(options.velmora_log.resolve(), options.make_drive.resolve(), scenario, seed,
+                problems += check(options.velmora_log.resolve(), options.make_drive.resolve(), scenario, seed, options.first,
                                   Path(folder))
     print("\n".join(problems[:50]))
     return 1 if problems else 0

@@ -118,5 +118,53 @@ TEST_F(MaskOptionTest, WatchMasksWhatItShows) {
     EXPECT_THAT(process.output(), Not(HasSubstr(iccid)));
 }
 
+TEST_F(MaskOptionTest, BrowseMasksItsScreenAndWhatItWrites) {
+    ToolProcess::Setup setup = tool({"browse", "--mask=location", path("drive.pcapng")});
+    setup.onTerminal = true;
+    setup.environment["LC_ALL"] = "C.UTF-8";
+    ToolProcess process(setup);
+    process.resize(200, 60);
+    auto place = process.waitFor("masked: location");
+    ASSERT_TRUE(place);
+    process.type("\t\ty"); // the bytes are copied
+    place = process.waitFor("copied: ", *place);
+    ASSERT_TRUE(place);
+    process.type("w" + path("part.pcapng") + "\r");
+    place = process.waitFor("1 messages written", *place);
+    ASSERT_TRUE(place);
+    const std::string screens = process.output();
+    process.type("/" + std::string(iccid) + "\r"); // which is on the screen because it was typed
+    ASSERT_TRUE(process.waitFor("no later message has", *place));
+    process.type("q");
+    EXPECT_EQ(process.exitStatus(), 0);
+    EXPECT_THAT(screens, HasSubstr("ICCID"));
+    EXPECT_THAT(screens, HasSubstr("-71 dBm"));
+    EXPECT_THAT(screens, Not(HasSubstr(iccid)));
+    EXPECT_THAT(screens, Not(HasSubstr("4711")));
+    EXPECT_THAT(contentOf("part.pcapng"), Not(HasSubstr(iccid)));
+    EXPECT_THAT(run({"mask", "--check", "--level", "location", path("part.pcapng")}),
+                HasSubstr("no identities of level location in clear"));
+}
+
+TEST_F(MaskOptionTest, BrowseWithAKeyShowsAndWritesWhatMaskWrites) {
+    run({"mask", "--level", "all", "--key", path("fleet.key"), path("drive.pcapng"), path("shared.pcapng")});
+    const auto lines = [this](std::vector<std::string> arguments) {
+        arguments.insert(arguments.begin(), {"browse", "--line"});
+        ToolProcess::Setup setup = tool(std::move(arguments));
+        setup.input = "d\nx\nh\nw " + path("copy.pcapng") + "\n";
+        ToolProcess process(setup);
+        EXPECT_EQ(process.exitStatus(), 0) << process.errors();
+        const std::string output = process.output();
+        return output.substr(output.find('\n'));
+    };
+    const std::string masked = lines({"--mask=all", "--key", path("fleet.key"), path("drive.pcapng")});
+    EXPECT_THAT(masked, HasSubstr("1 messages written"));
+    EXPECT_EQ(contentOf("copy.pcapng"), contentOf("shared.pcapng"));
+    std::filesystem::remove(path("copy.pcapng"));
+    EXPECT_EQ(lines({path("shared.pcapng")}), masked);
+    std::filesystem::remove(path("copy.pcapng"));
+    EXPECT_EQ(lines({"--mask=all", "--key", path("fleet.key"), path("shared.pcapng")}), masked);
+}
+
 } // namespace
 } // namespace velmora

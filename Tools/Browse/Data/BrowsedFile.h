@@ -3,12 +3,14 @@
 
 #pragma once
 
+#include "Export/Masking/MessageMask.h"
 #include "Playback/PlayedFile.h"
 #include "Playback/RecordingIndex.h"
 #include "Tools/Messages/CodeNames.h"
 
 #include <cstdint>
 #include <memory>
+#include <optional>
 #include <string>
 
 namespace velmora {
@@ -17,13 +19,17 @@ namespace velmora {
 /// 0. It is indexed in steps; what has been read so far can be looked at meanwhile. Main thread only.
 class BrowsedFile {
 public:
-    /// `technology`: its short name; empty for the first of the file. The reason does not repeat the path.
-    static Result<std::unique_ptr<BrowsedFile>> open(const std::string& path, const std::string& technology);
+    /// `technology`: its short name; empty for the first of the file. `masking`: absent for messages as they
+    /// are. The reason does not repeat the path.
+    static Result<std::unique_ptr<BrowsedFile>> open(const std::string& path, const std::string& technology,
+                                                     const std::optional<MaskOptions>& masking);
 
     /// Reads at most that many messages of the file on. False once all is read.
     bool readOn(std::uint64_t messages) { return _index->read(messages); }
 
     [[nodiscard]] const std::string& path() const { return _file->path(); }
+    /// How the messages are masked, so that they are masked the same once more; absent where they are not.
+    [[nodiscard]] std::optional<MaskOptions> masking() const;
     [[nodiscard]] const PlayedFile& file() const { return *_file; }
     [[nodiscard]] const RecordingIndex& index() const { return *_index; }
     /// How many messages have been read so far.
@@ -36,6 +42,7 @@ public:
 private:
     BrowsedFile() = default;
 
+    std::optional<MessageMask> _mask; ///< of all readers of the file
     std::unique_ptr<PlayedFile> _file;
     std::unique_ptr<RecordingIndex> _index;
     CodeNames _names;

@@ -3,6 +3,8 @@
 
 #include "Tools/Browse/Data/MarkedCopy.h"
 
+#include "Export/Masking/MaskedRecording.h"
+#include "Export/Masking/MessageMask.h"
 #include "Platform/Linux/Errno.h"
 #include "Platform/Linux/Files/AtomicFile.h"
 #include "Recording/Files/DescriptorFile.h"
@@ -57,10 +59,28 @@ Result<std::uint64_t> MarkedCopy::copyMessages(MessageReader& reader, Add add) c
     return written;
 }
 
+Result<std::uint64_t> MarkedCopy::writeMasked(MessageReader& reader, int descriptor) const {
+    MessageMask mask(*masking);
+    MaskedRecording recording(std::make_unique<DescriptorFile>(descriptor, false), output,
+                              {masking->level, masking->key.fingerprint(), {}});
+    recording.addSentencesOf(reader);
+    Result<std::uint64_t> written = copyMessages(
+        reader, [&](const LoggedMessage& message, std::span<const std::string> comments) -> Result<Done> {
+            const std::optional<LoggedMessage> masked = mask.mask(message, technology);
+            return masked ? recording.add(masked->time, masked->message.bytes(), technology, comments)
+                          : Result<Done>(Done{});
+        });
+    if (const Result<Done> finished = recording.finish(technology); written && !finished)
+        return Failure{finished.reason()};
+    return written;
+}
+
 Result<std::uint64_t> MarkedCopy::writeTo(int descriptor) const {
     const Result<std::unique_ptr<MessageReader>> reader = openMessages(input);
     if (!reader)
         return Failure{reader.reason()};
+    if (masking)
+        return writeMasked(**reader, descriptor);
     if (auto* const recording = dynamic_cast<PcapngReader*>(reader->get())) {
         RecordingCopy copy(*recording, std::make_unique<DescriptorFile>(descriptor, false), output,
                            {.technology = {}, .only = {}});

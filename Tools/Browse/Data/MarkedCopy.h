@@ -3,18 +3,21 @@
 
 #pragma once
 
+#include "Export/Masking/Pseudonyms.h"
 #include "Platform/Result.h"
 #include "Recording/MessageReader.h"
 
 #include <cstdint>
 #include <limits>
 #include <map>
+#include <optional>
 #include <string>
 
 namespace velmora {
 
 /// Some of a file's messages in a new recording, with notes as comments on them. The input is never changed,
-/// and nothing is overwritten. What a recording holds beside messages, such as positions, is kept.
+/// and nothing is overwritten. What a recording holds beside messages, such as positions, is kept; of a
+/// masked copy only the positions of receivers are, as `mask` keeps them.
 struct MarkedCopy {
     std::string input;
     std::string output;
@@ -25,9 +28,11 @@ struct MarkedCopy {
 
     /// Returns how many messages were written.
     [[nodiscard]] Result<std::uint64_t> write() const;
+    std::optional<MaskOptions> masking = std::nullopt; ///< absent for messages as they are
 
 private:
     [[nodiscard]] Result<std::uint64_t> writeTo(int descriptor) const;
+    [[nodiscard]] Result<std::uint64_t> writeMasked(MessageReader& reader, int descriptor) const;
     template <class Add>
     [[nodiscard]] Result<std::uint64_t> copyMessages(MessageReader& reader, Add add) const;
 };
