@@ -3,7 +3,7 @@
 
 #pragma once
 
-#include "Export/Masking/Pseudonyms.h"
+#include "Export/Masking/Pseudonyms/Pseudonyms.h"
 #include "Platform/Result.h"
 #include "Recording/MessageReader.h"
 
