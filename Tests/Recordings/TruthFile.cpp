@@ -3,27 +3,13 @@
 
 #include "Tests/Recordings/TruthFile.h"
 
+#include "Tests/Support/MomentText.h"
+
 #include <algorithm>
-#include <cstdio>
 #include <fstream>
 
 namespace velmora {
 namespace {
-
-/// "2026-01-05T08:00:12.345000000Z"
-std::string textOf(Time time) {
-    using namespace std::chrono;
-    const auto day = floor<days>(time);
-    const year_month_day date(day);
-    const hh_mm_ss clock(time - day);
-    char text[64];
-    std::snprintf(text, sizeof text, "%04d-%02u-%02uT%02d:%02d:%02d.%09lldZ", static_cast<int>(date.year()),
-                  static_cast<unsigned>(date.month()), static_cast<unsigned>(date.day()),
-                  static_cast<int>(clock.hours().count()), static_cast<int>(clock.minutes().count()),
-                  static_cast<int>(clock.seconds().count()),
-                  static_cast<long long>(clock.subseconds().count()));
-    return text;
-}
 
 /// The texts of truth events are names and numbers: nothing in them needs an escape.
 void append(std::string& line, std::string_view name, std::string_view value) {
@@ -37,9 +23,9 @@ void append(std::string& line, std::string_view name, std::string_view value) {
 
 std::string lineOf(const TruthEvent& event, Time start) {
     std::string line = "{";
-    append(line, "time", textOf(start + event.at));
+    append(line, "time", momentText(start + event.at));
     if (event.end)
-        append(line, "end", textOf(start + *event.end));
+        append(line, "end", momentText(start + *event.end));
     append(line, "kind", event.kind);
     if (event.isHidden)
         line += ",\"hidden\":true";

@@ -23,7 +23,7 @@ TableView::TableView(TableWidget* widget) : View(widget), _table(widget) {
 
 TableView::~TableView() {
     _table->view = nullptr;
-    _table->releaseCells();
+    _table->cells().clear();
 }
 
 void TableView::setDataSource(TableViewDataSource* dataSource) {
@@ -44,7 +44,7 @@ void TableView::reloadData() {
 }
 
 std::shared_ptr<TableCell> TableView::dequeueReusableCell(std::string_view identifier) {
-    return _table->dequeue(identifier);
+    return _table->cells().dequeue(identifier);
 }
 
 std::size_t TableView::numberOfSections() const {
@@ -57,13 +57,13 @@ std::size_t TableView::numberOfRowsInSection(std::size_t section) const {
 
 std::shared_ptr<TableCell> TableView::cellForRow(const IndexPath& indexPath) const {
     const auto row = _table->rows().row(indexPath);
-    const auto found = row ? _table->cells().find(*row) : _table->cells().end();
-    return found == _table->cells().end() ? nullptr : found->second;
+    const auto found = row ? _table->cells().all().find(*row) : _table->cells().all().end();
+    return found == _table->cells().all().end() ? nullptr : found->second;
 }
 
 std::vector<IndexPath> TableView::indexPathsForVisibleRows() const {
     std::vector<IndexPath> paths;
-    for (const auto& [row, cell] : _table->cells())
+    for (const auto& [row, cell] : _table->cells().all())
         paths.push_back(_table->rows().path(row));
     return paths;
 }

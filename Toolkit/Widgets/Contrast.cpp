@@ -12,14 +12,6 @@ namespace {
 
 constexpr double leastContrast = 3;
 
-/// Relative luminance of a colour in sRGB (WCAG 2).
-double luminance(const QColor& color) {
-    const auto linear = [](double part) {
-        return part <= 0.04045 ? part / 12.92 : std::pow((part + 0.055) / 1.055, 2.4);
-    };
-    return 0.2126 * linear(color.redF()) + 0.7152 * linear(color.greenF()) + 0.0722 * linear(color.blueF());
-}
-
 /// A colour that lets some of the ground through, as it is seen.
 QColor blended(const QColor& color, const QColor& ground) {
     const float part = color.alphaF();
@@ -29,6 +21,13 @@ QColor blended(const QColor& color, const QColor& ground) {
 }
 
 } // namespace
+
+double luminance(const QColor& color) {
+    const auto linear = [](double part) {
+        return part <= 0.04045 ? part / 12.92 : std::pow((part + 0.055) / 1.055, 2.4);
+    };
+    return 0.2126 * linear(color.redF()) + 0.7152 * linear(color.greenF()) + 0.0722 * linear(color.blueF());
+}
 
 double contrast(const QColor& one, const QColor& other) {
     const double first = luminance(one);

@@ -7,6 +7,9 @@
 
 namespace velmora {
 
+/// Relative luminance of a colour in sRGB as WCAG 2 defines it, 0 (black) to 1 (white).
+[[nodiscard]] double luminance(const QColor& color);
+
 /// The contrast of two opaque colours as WCAG 2 defines it, 1 to 21.
 [[nodiscard]] double contrast(const QColor& one, const QColor& other);
 

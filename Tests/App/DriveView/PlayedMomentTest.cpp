@@ -4,10 +4,10 @@
 #include "Tests/Analysis/Drive/KeptSamples.h"
 #include "Tests/App/DriveView/PlayedDriveFixture.h"
 #include "Tests/LogGenerator/Observations/DecodedTechnology.h"
+#include "Tests/Support/MomentText.h"
 #include "Tests/Support/ShellCommand.h"
 
 #include <algorithm>
-#include <cstdio>
 #include <random>
 #include <sstream>
 
@@ -123,18 +123,9 @@ TEST_P(PlayedMoment, ListsTheEventsThatTheCommandLists) {
     }
     std::vector<std::string> shown;
     const auto& events = playback().drive().model().events();
-    for (auto each = events.rbegin(); each != events.rend(); ++each) {
-        const std::time_t seconds = std::chrono::system_clock::to_time_t(
-            std::chrono::time_point_cast<std::chrono::system_clock::duration>(
-                std::chrono::floor<std::chrono::seconds>(each->time)));
-        const auto rest = (each->time - std::chrono::floor<std::chrono::seconds>(each->time)).count();
-        std::tm parts{};
-        ::gmtime_r(&seconds, &parts);
-        char text[64];
-        const std::size_t length = std::strftime(text, sizeof text, "%Y-%m-%dT%H:%M:%S", &parts);
-        std::snprintf(text + length, sizeof text - length, ".%09lldZ", static_cast<long long>(rest));
-        shown.push_back(std::string(text) + ' ' + std::string(nameOf(each->severity)) + ' ' + each->kind);
-    }
+    for (auto each = events.rbegin(); each != events.rend(); ++each)
+        shown.push_back(momentText(each->time) + ' ' + std::string(nameOf(each->severity)) + ' ' +
+                        each->kind);
     EXPECT_THAT(shown, ElementsAreArray(expected));
 }
 

@@ -3,11 +3,12 @@
 
 #include "Toolkit/Widgets/Charts/ChartTheme.h"
 
+#include "Toolkit/Widgets/Contrast.h"
+
 #include <QPainter>
 #include <QPolygonF>
 
 #include <algorithm>
-#include <cmath>
 
 namespace velmora {
 
@@ -15,14 +16,6 @@ namespace {
 
 constexpr QRgb onLight[] = {0xff1a5fb4, 0xffb35900, 0xff1b7a3d, 0xff8b3fa8, 0xffc0243a, 0xff00707a};
 constexpr QRgb onDark[] = {0xff78b4ff, 0xffffae57, 0xff74d192, 0xffd9a2f2, 0xffff8f94, 0xff63d4da};
-
-double linear(double part) {
-    return part <= 0.04045 ? part / 12.92 : std::pow((part + 0.055) / 1.055, 2.4);
-}
-
-double luminance(const QColor& color) {
-    return 0.2126 * linear(color.redF()) + 0.7152 * linear(color.greenF()) + 0.0722 * linear(color.blueF());
-}
 
 QColor mixed(const QColor& one, const QColor& other, double shareOfOther) {
     const auto part = [shareOfOther](float a, float b) {
@@ -42,12 +35,6 @@ ChartTheme::ChartTheme(const QPalette& palette)
     _text = readable(_text, 7);
     _faintText = readable(mixed(_text, _ground, 0.35), 4.5);
     _grid = mixed(_text, _ground, 0.85);
-}
-
-double ChartTheme::contrast(const QColor& one, const QColor& other) {
-    const double a = luminance(one);
-    const double b = luminance(other);
-    return (std::max(a, b) + 0.05) / (std::min(a, b) + 0.05);
 }
 
 QColor ChartTheme::readable(QColor color, double least) const {

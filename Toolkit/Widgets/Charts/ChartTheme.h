@@ -27,9 +27,6 @@ public:
     /// A band's area, under text in the ordinary colour.
     [[nodiscard]] QColor band(ChartColor color) const;
 
-    /// The contrast of two colours as WCAG 2 defines it, 1 to 21.
-    [[nodiscard]] static double contrast(const QColor& one, const QColor& other);
-
 private:
     /// The colour, made darker or lighter until its contrast to the ground is at least that.
     [[nodiscard]] QColor readable(QColor color, double least) const;

@@ -10,7 +10,7 @@
 namespace velmora {
 
 TableRowSummary rowSummary(const TableWidget& table, std::size_t row) {
-    if (const CellWidget* const shown = table.cellWidget(row); shown && shown->cell)
+    if (const CellWidget* const shown = table.cells().widget(row); shown && shown->cell)
         return {shown->cell->rowName(), shown->cell->accessory()};
     const IndexPath path = table.rows().path(row);
     return table.dataSource && table.view && !path.isNull()
@@ -24,7 +24,7 @@ QAccessible::State rowState(const TableWidget& table, std::size_t row, TableCell
     state.selectable = true;
     state.selected = table.selectedRow() == row;
     state.focused = table.hasFocus() && table.focusRow() == row;
-    state.offscreen = !table.cellWidget(row);
+    state.offscreen = !table.cells().widget(row);
     state.invisible = !table.isVisible();
     state.expandable = accessory == TableCellAccessory::disclosureIndicator;
     state.collapsed = state.expandable;

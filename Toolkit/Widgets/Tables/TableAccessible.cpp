@@ -29,7 +29,7 @@ QAccessibleInterface* TableAccessible::child(int index) const {
     const auto row = static_cast<std::size_t>(index);
     if (row >= _table.rows().total())
         return QAccessible::queryAccessibleInterface(&_table.emptyLabel());
-    if (CellWidget* const cell = _table.cellWidget(row))
+    if (CellWidget* const cell = _table.cells().widget(row))
         return QAccessible::queryAccessibleInterface(cell);
     const auto [found, isNew] = _unseen.try_emplace(row);
     if (isNew)
@@ -43,18 +43,18 @@ int TableAccessible::indexOfChild(const QAccessibleInterface* child) const {
     if (child->object() == &_table.emptyLabel())
         return 0;
     if (const auto* const cell = dynamic_cast<const CellWidget*>(child->object()))
-        return cell->row && _table.cellWidget(cell->row) == cell ? static_cast<int>(*cell->row) : -1;
+        return cell->row && _table.cells().widget(cell->row) == cell ? static_cast<int>(*cell->row) : -1;
     const auto* const unseen = dynamic_cast<const UnseenRow*>(child);
     return unseen && unseen->isValid() ? static_cast<int>(unseen->row()) : -1;
 }
 
 QAccessibleInterface* TableAccessible::childAt(int x, int y) const {
     const auto row = _table.rowAt(_table.viewport()->mapFromGlobal(QPoint(x, y)));
-    return QAccessible::queryAccessibleInterface(_table.cellWidget(row));
+    return QAccessible::queryAccessibleInterface(_table.cells().widget(row));
 }
 
 QAccessibleInterface* TableAccessible::focusChild() const {
-    CellWidget* const cell = _table.hasFocus() ? _table.cellWidget(_table.focusRow()) : nullptr;
+    CellWidget* const cell = _table.hasFocus() ? _table.cells().widget(_table.focusRow()) : nullptr;
     return cell ? QAccessible::queryAccessibleInterface(cell) : nullptr;
 }
 

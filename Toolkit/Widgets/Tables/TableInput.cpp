@@ -186,7 +186,7 @@ bool TableInput::moveFocus(int key) {
 }
 
 bool TableInput::scrollSideways(int direction) {
-    CellWidget* const cell = _table.cellWidget(_table.focusRow());
+    CellWidget* const cell = _table.cells().widget(_table.focusRow());
     if (!cell)
         return false;
     for (QWidget* const child : cell->findChildren<QWidget*>())

@@ -8,7 +8,6 @@
 #include "Toolkit/Widgets/Accessibility.h"
 #include "Toolkit/Widgets/Conversions.h"
 #include "Toolkit/Widgets/Scrolling/OverlayScrollBar.h"
-#include "Toolkit/Widgets/Scrolling/ScrollWidget.h"
 #include "Toolkit/Widgets/Tables/CellWidget.h"
 #include "Toolkit/Widgets/Tables/EmptyLabel.h"
 
@@ -26,7 +25,7 @@
 
 namespace velmora {
 
-TableWidget::TableWidget() : _emptyLabel(new EmptyLabel(*viewport())), _input(*this) {
+TableWidget::TableWidget() : _emptyLabel(new EmptyLabel(*viewport())), _cells(*this), _input(*this) {
     setObjectName("velmora.table");
     setFrameShape(QFrame::NoFrame);
     setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
@@ -39,13 +38,6 @@ TableWidget::TableWidget() : _emptyLabel(new EmptyLabel(*viewport())), _input(*t
 }
 
 TableWidget::~TableWidget() = default;
-
-void TableWidget::releaseCells() {
-    for (const auto& [row, cell] : _cells)
-        cell->widget()->setParent(nullptr);
-    _cells.clear();
-    _queue.clear();
-}
 
 void TableWidget::reload() {
     if (!view || _isLayingOut)
@@ -64,8 +56,7 @@ void TableWidget::reload() {
 
     // The cells stay where they are until they have been asked for again, and nothing is drawn before the
     // event loop turns: a row that shows what it showed is not even redrawn.
-    while (!_cells.empty())
-        recycle(_cells.rbegin()->first);
+    _cells.recycleAll();
     _selected = _rows.row(selected);
     _pressed = _pressed && *_pressed < _rows.total() ? _pressed : std::nullopt;
     if (!focus.isNull())
@@ -77,7 +68,7 @@ void TableWidget::reload() {
     showEmptyLabel();
     if (_rows.total() != before)
         announce(*this, QAccessible::ObjectReorder);
-    for (const auto& [row, cell] : _cells)
+    for (const auto& [row, cell] : _cells.all())
         static_cast<CellWidget*>(cell->widget())->announceName();
     if (_rows.path(_focus) != focus)
         announceFocus();
@@ -86,21 +77,6 @@ void TableWidget::reload() {
 void TableWidget::loadIfNeeded() {
     if (!_isLoaded)
         reload();
-}
-
-std::shared_ptr<TableCell> TableWidget::dequeue(std::string_view identifier) {
-    std::shared_ptr<TableCell> cell = _queue.take(identifier);
-    if (!cell)
-        return nullptr;
-    cell->setFrame(
-        {0, cell->frame().y, static_cast<double>(viewport()->width()), static_cast<double>(rowHeight())});
-    cell->prepareForReuse();
-    return cell;
-}
-
-CellWidget* TableWidget::cellWidget(std::optional<std::size_t> row) const {
-    const auto found = row ? _cells.find(*row) : _cells.end();
-    return found == _cells.end() ? nullptr : static_cast<CellWidget*>(found->second->widget());
 }
 
 void TableWidget::showEmptyLabel() {
@@ -191,46 +167,9 @@ void TableWidget::layoutRows() {
     const int bottom = offset + viewport()->height();
     const auto end =
         std::min(static_cast<std::size_t>(std::max((bottom + height - 1) / height, 0)), _rows.total());
-
-    std::vector<std::size_t> leaving;
-    for (const auto& [row, cell] : _cells)
-        if (row < first || row >= end)
-            leaving.push_back(row);
-    for (const std::size_t row : leaving)
-        recycle(row);
-    for (std::size_t row = first; row < end; ++row) {
-        std::shared_ptr<TableCell>& cell = _cells[row];
-        if (!cell)
-            cell = makeCell(row);
-        cell->setFrame(fromQt(rowRect(row)));
-        cell->setHidden(false);
-    }
-    _queue.hideAll();
+    _cells.show(first, end);
     updateMarks();
     _isLayingOut = false;
-}
-
-void TableWidget::recycle(std::size_t row) {
-    const auto node = _cells.extract(row);
-    static_cast<CellWidget*>(node.mapped()->widget())->row.reset();
-    _queue.add(node.mapped());
-}
-
-std::shared_ptr<TableCell> TableWidget::makeCell(std::size_t row) {
-    std::shared_ptr<TableCell> cell = dataSource->cellForRowAtIndexPath(*view, _rows.path(row));
-    if (!cell)
-        cell = std::make_shared<TableCell>(TableCellStyle::plain, std::string());
-    auto* const widget = static_cast<CellWidget*>(cell->widget());
-    if (widget->parentWidget() != viewport())
-        widget->setParent(viewport());
-    widget->row = row;
-    if (std::exchange(widget->lastRow, row) != row)
-        for (QObject* const child : widget->findChildren<QWidget*>())
-            if (auto* const scroller = dynamic_cast<ScrollWidget*>(child))
-                scroller->setOffset(0);
-    cell->setFrame(fromQt(rowRect(row)));
-    cell->layoutSubviews(); // its texts may be others than when it was last laid out
-    return cell;
 }
 
 void TableWidget::updateScrollRange() {
@@ -244,7 +183,7 @@ void TableWidget::updateScrollRange() {
 }
 
 void TableWidget::updateMarks() {
-    for (const auto& [row, cell] : _cells) {
+    for (const auto& [row, cell] : _cells.all()) {
         if (!cell) // being made
             continue;
         auto* const widget = static_cast<CellWidget*>(cell->widget());
@@ -255,7 +194,7 @@ void TableWidget::updateMarks() {
 }
 
 void TableWidget::announceFocus() {
-    CellWidget* const widget = cellWidget(_focus);
+    CellWidget* const widget = _cells.widget(_focus);
     if (widget && hasFocus())
         announce(*widget, QAccessible::Focus);
 }

@@ -3,28 +3,24 @@
 
 #pragma once
 
-#include "Toolkit/Widgets/Tables/ReuseQueue.h"
+#include "Toolkit/Widgets/Tables/ShownCells.h"
 #include "Toolkit/Widgets/Tables/TableInput.h"
 #include "Toolkit/Widgets/Tables/TableRows.h"
 
 #include <QAbstractScrollArea>
 
 #include <cstddef>
-#include <map>
-#include <memory>
 #include <optional>
 
 namespace velmora {
 
-class CellWidget;
 class EmptyLabel;
-class TableCell;
 class TableView;
 class TableViewDataSource;
 class TableViewDelegate;
 
-/// Keeps cells for the rows on the screen, moves them as the user scrolls, and has the table's focus,
-/// selection and pressed row. Rows are counted through all sections.
+/// Lays out the rows on the screen as the user scrolls, and has the table's focus, selection and pressed row.
+/// Rows are counted through all sections.
 class TableWidget : public QAbstractScrollArea {
 public:
     TableWidget();
@@ -38,12 +34,10 @@ public:
     void reload();
     /// Loads the rows if they are not loaded yet.
     void loadIfNeeded();
-    [[nodiscard]] std::shared_ptr<TableCell> dequeue(std::string_view identifier);
-    void releaseCells();
 
     [[nodiscard]] const TableRows& rows() const { return _rows; }
-    [[nodiscard]] const std::map<std::size_t, std::shared_ptr<TableCell>>& cells() const { return _cells; }
-    [[nodiscard]] CellWidget* cellWidget(std::optional<std::size_t> row) const;
+    [[nodiscard]] ShownCells& cells() { return _cells; }
+    [[nodiscard]] const ShownCells& cells() const { return _cells; }
     [[nodiscard]] EmptyLabel& emptyLabel() const { return *_emptyLabel; }
     /// Shows or hides it.
     void showEmptyLabel();
@@ -63,9 +57,9 @@ public:
     /// The focus frame is shown after keyboard use and hidden by the next click.
     void setShowsFocus(bool shows);
     void scrollToRow(std::size_t row);
-    /// Selects the row and notifies the delegate, which may destroy the table.
     /// Opens the row's menu, if it has one, at that place of the viewport.
     void openMenu(std::size_t row, const QPoint& place);
+    /// Selects the row and notifies the delegate, which may destroy the table.
     void activateRow(std::size_t row);
 
 protected:
@@ -81,16 +75,13 @@ protected:
 
 private:
     void layoutRows();
-    void recycle(std::size_t row);
-    [[nodiscard]] std::shared_ptr<TableCell> makeCell(std::size_t row);
     void updateScrollRange();
     void updateMarks();
     void announceFocus();
 
     EmptyLabel* _emptyLabel;
     TableRows _rows;
-    std::map<std::size_t, std::shared_ptr<TableCell>> _cells;
-    ReuseQueue _queue;
+    ShownCells _cells;
     TableInput _input;
     std::optional<std::size_t> _selected;
     std::optional<std::size_t> _focus;
