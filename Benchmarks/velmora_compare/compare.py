@@ -105,6 +105,9 @@ def drives(messages: int, chosen: Namespace) -> str:
 
 def run(chosen: Namespace, directory: Path) -> int:
     every = chosen_programs(chosen)
+    if not every:
+        print("compare: no program is left to measure", file=sys.stderr)
+        return 1
     comparison = Comparison(chosen, every, directory)
     problems = comparison.problems()
     for problem in problems:
