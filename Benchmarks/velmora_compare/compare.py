@@ -99,26 +99,35 @@ def chosen_programs(chosen: Namespace) -> dict[str, Program]:
     return {name: program for name, program in asked.items() if not program.missing}
 
 
+def drives(messages: int, chosen: Namespace) -> str:
+    return f"{messages:,} messages, of slow programs {messages // SLOW_SHARE:,}, seed {chosen.seed}"
+
+
 def run(chosen: Namespace, directory: Path) -> int:
     every = chosen_programs(chosen)
+    if not every:
+        print("compare: no program is left to measure", file=sys.stderr)
+        return 1
     comparison = Comparison(chosen, every, directory)
     problems = comparison.problems()
     for problem in problems:
         print(f"compare: {problem}", file=sys.stderr)
     if problems:
         return 1
-    print(f"{circumstances()}; {chosen.messages:,} messages, of slow programs {chosen.messages // SLOW_SHARE:,}, "
-          f"seed {chosen.seed}, {chosen.rounds} rounds, {chosen.time} time\n", flush=True)
+    print(circumstances())
     if chosen.time != "none":
+        print(f"\n{drives(chosen.messages, chosen)}, {chosen.rounds} rounds, {chosen.time} time\n", flush=True)
         print(table("ns", every, chosen.recordings, comparison.times()), flush=True)
-        print(f"\nload average at the end: {circumstances()}\n")
-    if chosen.instructions != "none":
-        counter = instructions.counter()
-        if counter is None:
-            print("instructions are left out: neither perf nor valgrind counts them here", file=sys.stderr)
-        else:
-            print(f"instructions by {counter.name}\n", flush=True)
-            print(table("instructions", every, chosen.recordings, comparison.instructions(counter)))
+        print(f"\nat the end: {circumstances()}")
+    if chosen.instructions == "none":
+        return 0
+    counter = instructions.counter()
+    if counter is None:
+        print("instructions are left out: neither perf nor valgrind counts them here", file=sys.stderr)
+        return 0
+    messages = chosen.counted if counter.is_slow else chosen.messages
+    print(f"\n{drives(messages, chosen)}, instructions by {counter.name}\n", flush=True)
+    print(table("instructions", every, chosen.recordings, comparison.instructions(counter)))
     return 0
 
 

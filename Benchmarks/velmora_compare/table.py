@@ -26,7 +26,8 @@ def spread(program: Program, recordings: Sequence[str], costs: Costs) -> str:
     spreads = [costs[program.name, recording].spread for recording in recordings if (program.name, recording) in costs]
     if not any(spreads):
         return ""
-    return f"{min(spreads) * 100:.0f} to {max(spreads) * 100:.0f} %"
+    least, most = (f"{each * 100:.0f}" for each in (min(spreads), max(spreads)))
+    return f"{most} %" if least == most else f"{least} to {most} %"
 
 
 def table(unit: str, programs: Mapping[str, Program], recordings: Sequence[str], costs: Costs) -> str:

@@ -32,6 +32,10 @@ class TableTest(unittest.TestCase):
             "| copy: copying |  | 25.0 |  |  |",
         ])
 
+    def test_the_spread_of_one_recording_is_one_number(self) -> None:
+        row = table("ns", PROGRAMS, ["gsm"], {("copy", "gsm"): Cost([19.0, 20.0, 21.0])}).splitlines()[2]
+        self.assertEqual(row, "| copy: copying |  | 20.0 | 10 % |")
+
     def test_counts_have_no_spread(self) -> None:
         self.assertEqual(table("instructions", PROGRAMS, ["c2k"], {("stats", "c2k"): Cost([6390.0])}).splitlines(), [
             "| instructions, a message (times) | times what | Ostrel CDMA |",
