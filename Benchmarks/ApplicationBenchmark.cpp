@@ -17,9 +17,9 @@
 // What the application costs beside the floor of a bare Qt window with a table of as many rows, in the same
 // run: start to the first painted window, memory, and a redraw of 400 rows whose values have all changed.
 // Each start is a process of its own. Then, with "--flood SECONDS" and velmora-telephonyd sending at a speed
-// of its own, the event loop's latency, processor time and memory; "--idle SECONDS" leaves out the latency,
-// whose probe wakes the process itself. With "--drive" the drive view stands beside the panes, in a window of
-// 1280 by 800 points.
+// of its own, the event loop's latency, how long messages wait for the screen, processor time and memory;
+// "--idle SECONDS" leaves out the first two, whose probe wakes the process itself. With "--drive" the drive
+// view stands beside the panes, in a window of 1280 by 800 points.
 //
 //   QT_QPA_PLATFORM=offscreen bench-application [--drive]
 //   velmora-telephonyd --source scenario:gsm,seed=1,speed=520 &

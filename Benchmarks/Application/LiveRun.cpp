@@ -7,8 +7,10 @@
 #include "App/LinuxAppPlatform.h"
 #include "App/VelmoraApp.h"
 #include "Benchmarks/Application/Figures.h"
+#include "Benchmarks/Application/Repaints.h"
 #include "Platform/Linux/Files/FileResources.h"
 
+#include <QApplication>
 #include <QElapsedTimer>
 #include <QTimer>
 
@@ -18,6 +20,16 @@
 #include <vector>
 
 namespace velmora {
+
+namespace {
+
+void printShares(const char* what, const std::vector<double>& ordered_ms) {
+    std::printf("%s: median %.2f ms, 99 %% %.2f ms, most %.2f ms (%zu probes)\n", what,
+                ordered_ms[ordered_ms.size() / 2], ordered_ms[ordered_ms.size() * 99 / 100],
+                ordered_ms.back(), ordered_ms.size());
+}
+
+} // namespace
 
 int runLive(int argc, char** argv, int seconds, bool probes, bool hasDrive) {
     FileResources files;
@@ -36,8 +48,11 @@ int runLive(int argc, char** argv, int seconds, bool probes, bool hasDrive) {
             late_ms.push_back(static_cast<double>(since.nsecsElapsed()) / 1e6 - 10);
         since.start();
     });
-    if (probes)
+    Repaints repaints;
+    if (probes) {
         probe.start();
+        qApp->installEventFilter(&repaints);
+    }
     // The start is measured by itself: these figures begin when the screens are up and the charts have some
     // samples.
     constexpr int settled_ms = 5000;
@@ -51,6 +66,7 @@ int runLive(int argc, char** argv, int seconds, bool probes, bool hasDrive) {
     QTimer::singleShot(settled_ms, [&] {
         begun_ms = processorTime_ms();
         late_ms.clear();
+        repaints.clear();
     });
     QTimer::singleShot(settled_ms + seconds * 1000, [&] {
         used_ms = processorTime_ms() - begun_ms;
@@ -68,9 +84,11 @@ int runLive(int argc, char** argv, int seconds, bool probes, bool hasDrive) {
         std::fputs("no telephony service answered\n", stderr);
         return 1;
     }
-    std::printf("the event loop was late by: median %.2f ms, 99 %% %.2f ms, most %.2f ms (%zu probes)\n",
-                late_ms[late_ms.size() / 2], late_ms[late_ms.size() * 99 / 100], late_ms.back(),
-                late_ms.size());
+    printShares("the event loop was late by", late_ms);
+    const std::vector<double> waits_ms = repaints.waits_ms();
+    std::printf("painted %zu times\n", repaints.count());
+    if (!waits_ms.empty())
+        printShares("messages waited for the screen", waits_ms);
     return status;
 }
 

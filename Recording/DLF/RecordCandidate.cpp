@@ -55,17 +55,6 @@ int timestampScore(std::uint64_t timestamp, std::optional<std::uint64_t> nearby,
 
 } // namespace
 
-std::size_t sizeOf(Framing framing) {
-    switch (framing) {
-    case Framing::Nothing: return 0;
-    case Framing::Type:
-    case Framing::OtherType: return 1;
-    case Framing::PartialPrefix: return LogMessage::prefixLength;
-    case Framing::Prefix: return LogMessage::prefixLength + 1;
-    }
-    return 0;
-}
-
 std::optional<RecordCandidate> RecordCandidate::read(Bytes bytes, Framing framing,
                                                      std::optional<std::uint64_t> nearby,
                                                      const RecordWeights& weights) {

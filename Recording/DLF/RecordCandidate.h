@@ -26,7 +26,16 @@ inline constexpr Framing allFramings[] = {Framing::Type, Framing::Prefix, Framin
                                           Framing::PartialPrefix, Framing::OtherType};
 
 /// Bytes that the framing takes.
-[[nodiscard]] std::size_t sizeOf(Framing framing);
+[[nodiscard]] constexpr std::size_t sizeOf(Framing framing) {
+    switch (framing) {
+    case Framing::Nothing: return 0;
+    case Framing::Type:
+    case Framing::OtherType: return 1;
+    case Framing::PartialPrefix: return LogMessage::prefixLength;
+    case Framing::Prefix: return LogMessage::prefixLength + 1;
+    }
+    return 0;
+}
 
 /// A possible record at some bytes, and how strong the evidence for it is.
 struct RecordCandidate {

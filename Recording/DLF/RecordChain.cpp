@@ -9,7 +9,8 @@
 
 #include <algorithm>
 #include <iterator>
-#include <vector>
+#include <limits>
+#include <utility>
 
 namespace velmora {
 
@@ -31,6 +32,8 @@ bool RecordChain::looksLikeRecords() {
 std::optional<RecordChain::Record> RecordChain::next() {
     _input.skip(std::exchange(_present, 0));
     while (_input.ensure(1)) {
+        if (const std::optional<RecordCandidate> record = evident())
+            return take(*record);
         const Survey here = survey();
         // Unless both ends of it are sure, one record may lead to another by chance: a damaged length hits
         // a record now and then, and after a message that was cut short one may end where its length says.
@@ -44,6 +47,51 @@ std::optional<RecordChain::Record> RecordChain::next() {
         skipDamage(here);
     }
     return std::nullopt;
+}
+
+/// The candidates at `at`, compared by what they score themselves. Absent near the input's end too.
+std::optional<RecordChain::Ranking> RecordChain::rankAt(std::size_t at, std::optional<std::uint64_t> nearby) {
+    if (!_input.ensure(at + sizeOf(Framing::Prefix) + RecordCandidate::bareHeaderLength))
+        return std::nullopt;
+    const Bytes bytes = _input.available().subspan(at);
+    std::optional<Ranking> ranking;
+    int others = std::numeric_limits<int>::min() / 2;
+    for (const Framing framing : allFramings) {
+        if (!allows(framing))
+            continue;
+        const std::optional<RecordCandidate> candidate =
+            RecordCandidate::read(bytes, framing, nearby, _weights);
+        if (candidate && ranking && candidate->score <= ranking->best.score) {
+            others = std::max(others, candidate->score);
+        } else if (candidate) {
+            others = ranking ? ranking->best.score : others;
+            ranking = Ranking{*candidate, others};
+        }
+    }
+    if (ranking)
+        ranking->others = others;
+    return ranking;
+}
+
+/// The record that `survey` would find and `next` take as it is, at a fraction of the cost: it is sure and so
+/// is what follows it, and no other candidate could score as much with whatever follows that. Absent where it
+/// takes more to say.
+std::optional<RecordCandidate> RecordChain::evident() {
+    std::optional<Ranking> here = std::exchange(_follower, std::nullopt);
+    if (!here)
+        here = rankAt(0, _timestamp);
+    if (!here || here->best.score < _weights.sure)
+        return std::nullopt;
+    RecordCandidate& record = here->best;
+    const std::optional<Ranking> follower =
+        rankAt(record.size, record.hasTime() ? record.timestamp : _timestamp);
+    if (!follower || follower->best.score < std::max(_weights.sure, _weights.goodFollower))
+        return std::nullopt;
+    record.followerScore = follower->best.score;
+    if (record.total() < _weights.expected || here->others + _weights.mostOfFollower() >= record.total())
+        return std::nullopt;
+    _follower = follower;
+    return record;
 }
 
 RecordChain::Survey RecordChain::survey() {
@@ -147,12 +195,7 @@ RecordChain::Record RecordChain::take(const RecordCandidate& candidate) {
         record.message = _input.part(0, candidate.size);
         return record;
     }
-    std::vector<std::uint8_t> bytes;
-    bytes.reserve(candidate.size + 1);
-    bytes.push_back(*missing);
-    const Bytes rest = _input.available().first(candidate.size);
-    bytes.insert(bytes.end(), rest.begin(), rest.end());
-    record.message = Data(std::move(bytes));
+    record.message = _restored.add(*missing, _input.available().first(candidate.size));
     return record;
 }
 

@@ -5,6 +5,7 @@
 
 #include "Recording/DLF/RecordCandidate.h"
 #include "Recording/DLF/RecordWeights.h"
+#include "Recording/DLF/RestoredMessages.h"
 #include "Recording/Files/ChunkedInput.h"
 #include "Recording/MessageReader.h"
 
@@ -63,7 +64,15 @@ private:
         std::optional<RecordCandidate> truncated; ///< likewise, but reaches past the end of the input
     };
 
+    /// What the current bytes most likely are.
+    struct Ranking {
+        RecordCandidate best; ///< by its own score
+        int others;           ///< the most that another candidate there scores
+    };
+
     [[nodiscard]] bool allows(Framing framing) const;
+    [[nodiscard]] std::optional<Ranking> rankAt(std::size_t at, std::optional<std::uint64_t> nearby);
+    [[nodiscard]] std::optional<RecordCandidate> evident();
     [[nodiscard]] std::optional<RecordCandidate> candidateAt(std::size_t at, Framing framing,
                                                              std::optional<std::uint64_t> nearby);
     [[nodiscard]] int scoreAt(std::size_t at, std::optional<std::uint64_t> nearby);
@@ -79,6 +88,8 @@ private:
     RecordWeights _weights;
     std::size_t _present = 0;                ///< size of the record that `next` last returned
     std::optional<std::uint64_t> _timestamp; ///< the last valid one
+    std::optional<Ranking> _follower;        ///< what `evident` saw after the record that it returned
+    RestoredMessages _restored;
     std::optional<Loss> _loss;
 };
 

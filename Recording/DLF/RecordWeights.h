@@ -3,6 +3,8 @@
 
 #pragma once
 
+#include <algorithm>
+
 namespace velmora {
 
 /// The evidence of each trait that a record begins at an offset, in bits: log2 of how much more often a
@@ -24,6 +26,12 @@ struct RecordWeights {
     int goodFollower = 4; ///< least score at a record's end for the two to be linked
     int expected = 8;     ///< least score for a record where one is expected
     int sure = 20;        ///< least score, both ends together, for a record in the midst of damage
+
+    /// The most that what follows a record can score. A version report has no framing that scores.
+    [[nodiscard]] constexpr int mostOfFollower() const {
+        const int time = std::max({nearTimestamp, zeroAmongZeros, zeroAmongTimes, 0});
+        return std::max({type + prefix + time + wantedCode, time + versionReport, endOfInput});
+    }
 };
 
 } // namespace velmora
