@@ -116,7 +116,7 @@ void MessageLines::concerned(Base& section) {
     if (!_first)
         line().append(',');
     _first = false;
-    _sections.try_emplace(&section, section).first->second.append(line());
+    _sections.try_emplace(&section, section, _texts).first->second.append(line());
 }
 
 void MessageLines::values(std::optional<std::uint32_t> code) {
@@ -130,7 +130,7 @@ void MessageLines::values(std::optional<std::uint32_t> code) {
 FieldVisitor* MessageLines::valueVisitor() {
     if (_current)
         return nullptr;
-    JSONNode& node = _values.try_emplace(_code, false).first->second;
+    JSONNode& node = _values.try_emplace(_code, false, _texts).first->second;
     return &_valueWriter.emplace(node, JSONFieldWriter::Into::Values);
 }
 

@@ -68,6 +68,7 @@ private:
     const NodeSelection& _selection;
     std::map<std::string, Places, std::less<>> _places; ///< by technology; with a selection only
     const Places* _current = nullptr;
+    JSONTexts _texts;
     std::unordered_map<const Base*, SectionText> _sections;
     std::unordered_map<std::uint32_t, JSONNode> _values; ///< of each code, as its latest message published
     std::uint32_t _code = 0;                             ///< of the values of this message

@@ -48,15 +48,17 @@ private:
         bool isInOrder = false; ///< members are written one after another, from `next` on
         bool isOpen = false;    ///< fields are written here
         const List* numbered = nullptr;
-        JSONMember* member = nullptr; ///< of a numbered list
+        std::size_t member = 0; ///< of a numbered list, in the level above
     };
     /// As deep as a DisplayWriter's.
     static constexpr std::size_t deepest = 5;
 
     [[nodiscard]] Level& level() { return _levels[_depth]; }
     void push(const Level& next);
-    /// The member for what this constant names; null where it is ignored.
-    [[nodiscard]] JSONMember* memberFor(const void* source, std::string_view label);
+    static constexpr std::size_t nowhere = ~std::size_t{0};
+
+    /// The member for what this constant names; nowhere where it is ignored.
+    [[nodiscard]] std::size_t memberFor(const void* source, std::string_view label);
 
     Into _into;
     std::array<Level, deepest> _levels;

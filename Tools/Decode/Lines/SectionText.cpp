@@ -9,7 +9,7 @@
 
 namespace velmora {
 
-SectionText::SectionText(Base& section) : _section(section) {
+SectionText::SectionText(Base& section, JSONTexts& texts) : _section(section), _texts(texts) {
     appendJsonString(_name, section.getSectionName());
     _name.append(':');
 }
@@ -34,7 +34,7 @@ void SectionText::update() {
         follow();
     } else {
         const Value node = _section.node();
-        _node.emplace(node.asArray() != nullptr);
+        _node.emplace(node.asArray() != nullptr, _texts);
         _node->read(node);
     }
     _changes = changes;

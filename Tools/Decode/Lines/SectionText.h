@@ -17,8 +17,8 @@ class Base;
 /// were not to be shown, a node of another display - the node itself is read.
 class SectionText {
 public:
-    /// `section` has a node and outlives this.
-    explicit SectionText(Base& section);
+    /// Both outlive this.
+    SectionText(Base& section, JSONTexts& texts);
 
     /// Appends its name, a colon and the node as it is now. Precondition: the section has one.
     void append(TextBuffer& out);
@@ -29,6 +29,7 @@ private:
     void follow();
 
     Base& _section;
+    JSONTexts& _texts;
     TextBuffer _name; ///< with the colon
     std::optional<JSONNode> _node;
     std::optional<std::uint64_t> _changes; ///< the section's, when `_node` was its node
