@@ -10,7 +10,6 @@
 
 #include <functional>
 #include <map>
-#include <optional>
 #include <string>
 #include <unordered_map>
 #include <vector>
@@ -71,8 +70,9 @@ private:
     JSONTexts _texts;
     std::unordered_map<const Base*, SectionText> _sections;
     std::unordered_map<std::uint32_t, JSONNode> _values; ///< of each code, as its latest message published
-    std::uint32_t _code = 0;                             ///< of the values of this message
-    std::optional<JSONFieldWriter> _valueWriter;         ///< while they are named
+    JSONFieldWriter _writer;
+    std::uint32_t _code = 0;    ///< of the values of this message
+    JSONNode* _named = nullptr; ///< its values, once they are named
     std::string _begin;
     std::string _technology; ///< the member, from the quote after the time on to that before the next comma
     Time _moment{};

@@ -31,7 +31,9 @@ std::int64_t read(const Place& place, const Record& record) {
 
 } // namespace
 
-JSONFieldWriter::JSONFieldWriter(JSONNode& node, Into into) : _into(into) {
+void JSONFieldWriter::begin(JSONNode& node, Into into) {
+    _into = into;
+    _depth = 0;
     _levels[0] = {&node, 0, into == Into::Values, !node.isArray()};
 }
 

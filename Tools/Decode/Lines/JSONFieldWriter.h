@@ -21,8 +21,8 @@ public:
         Values   ///< what is named is all that there is, in this order; numbered lists are dictionaries
     };
 
-    JSONFieldWriter(JSONNode& node, Into into);
-    /// Everything has been named.
+    /// What is named up to `end` is written into the node. It is begun again where naming was not completed.
+    void begin(JSONNode& node, Into into);
     void end();
 
     void fields(const Record& record, const Layout& layout) override;
@@ -60,7 +60,7 @@ private:
     /// The member for what this constant names; nowhere where it is ignored.
     [[nodiscard]] std::size_t memberFor(const void* source, std::string_view label);
 
-    Into _into;
+    Into _into = Into::Section;
     std::array<Level, deepest> _levels;
     std::size_t _depth = 0;
     std::string _entryKey; ///< of the next entry of a numbered list

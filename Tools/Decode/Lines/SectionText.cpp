@@ -9,7 +9,8 @@
 
 namespace velmora {
 
-SectionText::SectionText(Base& section, JSONTexts& texts) : _section(section), _texts(texts) {
+SectionText::SectionText(Base& section, JSONTexts& texts, JSONFieldWriter& writer)
+    : _section(section), _texts(texts), _writer(writer) {
     appendJsonString(_name, section.getSectionName());
     _name.append(':');
 }
@@ -41,8 +42,9 @@ void SectionText::update() {
 }
 
 void SectionText::follow() {
-    JSONFieldWriter writer(*_node, JSONFieldWriter::Into::Section);
-    _section.nameLatest(writer);
+    _writer.begin(*_node, JSONFieldWriter::Into::Section);
+    _section.nameLatest(_writer);
+    _writer.end();
 }
 
 } // namespace velmora
