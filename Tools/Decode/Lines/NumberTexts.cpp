@@ -6,6 +6,7 @@
 #include "Tools/Text/JSONText.h"
 
 #include <algorithm>
+#include <utility>
 
 namespace velmora {
 
@@ -26,10 +27,10 @@ std::string_view NumberTexts::format(std::int64_t raw) {
     appendJsonString(_formatted, FormattedText(_field.format, raw).view());
     const std::string_view text = _formatted.view();
     Slot& slot = _slots[static_cast<std::size_t>(raw) & (_slots.size() - 1)];
-    if (text.size() <= slot.text.size()) {
+    if (text.size() <= slot.text.size() && std::in_range<std::int32_t>(raw)) {
         text.copy(slot.text.data(), text.size());
         slot.length = static_cast<std::uint8_t>(text.size());
-        slot.raw = raw;
+        slot.raw = static_cast<std::int32_t>(raw);
     }
     return text;
 }

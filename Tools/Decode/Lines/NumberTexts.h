@@ -28,10 +28,11 @@ public:
     }
 
 private:
-    struct Slot {
-        std::int64_t raw = 0;
+    /// Half of a cache line: the texts of a table's levels are to stay in the nearest cache.
+    struct alignas(32) Slot {
+        std::int32_t raw = 0;
         std::uint8_t length = 0; ///< 0 where there is none
-        std::array<char, 39> text;
+        std::array<char, 27> text;
     };
 
     [[nodiscard]] std::string_view format(std::int64_t raw);
