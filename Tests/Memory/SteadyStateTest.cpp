@@ -9,6 +9,8 @@
 #include "Tests/Support/FakeClock.h"
 #include "Tests/Support/FakeResources.h"
 #include "Tests/Support/ShippedResources.h"
+#include "Tools/Decode/JSONLines.h"
+#include "Tools/Output.h"
 
 #include <gtest/gtest.h>
 
@@ -18,7 +20,11 @@
 #include <string>
 #include <vector>
 
-// A decoder that has seen a drive decodes it again without allocating anything, observed or not.
+#include <fcntl.h>
+#include <unistd.h>
+
+// A decoder that has seen a drive decodes it again without allocating anything, observed or not, and so does
+// what writes a line of each message.
 
 namespace velmora {
 namespace {
@@ -66,11 +72,17 @@ protected:
 
     /// Decodes the drive. What that allocates, the redraws left out.
     std::uint64_t allocationsOfDrive() {
+        return allocationsOf([this](const Data& message) { decoder->updateState(state, message); });
+    }
+
+    /// The same of what is done for each message.
+    template <class Decode>
+    std::uint64_t allocationsOf(Decode decode) {
         std::uint64_t allocations = 0;
         for (std::size_t i = 0; i < messages.size(); ++i) {
             {
                 const Allocations counted;
-                decoder->updateState(state, messages[i]);
+                decode(messages[i]);
                 allocations += counted.count();
             }
             if (i % redrawEvery == 0)
@@ -116,6 +128,28 @@ TEST_P(SteadyStateTest, ObservationsAllocateNothing) {
     // Not exactly as many: some values count from an earlier record.
     EXPECT_GT(sink.observations, 2 * observations - messages.size() / 100);
     decoder->setObservationSink(nullptr);
+}
+
+TEST_P(SteadyStateTest, LinesOfMessagesAllocateNothing) {
+    const int nowhere = ::open("/dev/null", O_WRONLY | O_CLOEXEC);
+    ASSERT_GE(nowhere, 0);
+    {
+        Output output(nowhere);
+        const NodeSelection everything;
+        MessageLines lines(output, false, everything, "");
+        lines.didMakeDecoder(*decoder);
+        Decoded decoded;
+        lines.willConcern(decoded);
+        LoggedMessage logged;
+        const auto writeLine = [&](const Data& message) {
+            lines.willDecode(logged);
+            decoder->updateStateReporting(state, message, *lines.effects());
+            lines.didDecode(logged, *decoder, state);
+        };
+        EXPECT_GT(allocationsOf(writeLine), 100u);
+        EXPECT_EQ(allocationsOf(writeLine), 0u);
+    }
+    ::close(nowhere);
 }
 
 INSTANTIATE_TEST_SUITE_P(Drives, SteadyStateTest,

@@ -92,7 +92,7 @@ void MessageLines::willConcern(const Decoded& decoded) {
 }
 
 void MessageLines::didDecode(const LoggedMessage&, LogGenerator&, Dictionary&) {
-    if (_valueWriter)
+    if (_named)
         endValues();
     if (_current && _first)
         dropLine();
@@ -116,29 +116,30 @@ void MessageLines::concerned(Base& section) {
     if (!_first)
         line().append(',');
     _first = false;
-    _sections.try_emplace(&section, section).first->second.append(line());
+    _sections.try_emplace(&section, section, _texts, _writer).first->second.append(line());
 }
 
 void MessageLines::values(std::optional<std::uint32_t> code) {
     begin();
     appendCode(code);
     line().append(",\"values\":{");
+    _named = nullptr;
     _code = code.value_or(0);
-    _valueWriter.reset();
 }
 
 FieldVisitor* MessageLines::valueVisitor() {
     if (_current)
         return nullptr;
-    JSONNode& node = _values.try_emplace(_code, false).first->second;
-    return &_valueWriter.emplace(node, JSONFieldWriter::Into::Values);
+    _named = &_values.try_emplace(_code, false, _texts).first->second;
+    _writer.begin(*_named, JSONFieldWriter::Into::Values);
+    return &_writer;
 }
 
 void MessageLines::endValues() {
-    _valueWriter->end();
-    _valueWriter.reset();
+    _writer.end();
     line().truncate(line().size() - 1); // the node has its own brackets
-    _values.at(_code).append(line());
+    _named->append(line());
+    _named = nullptr;
     _end = "}\n";
 }
 
@@ -161,10 +162,7 @@ void MessageLines::begin() {
 
 void MessageLines::appendCode(std::optional<std::uint32_t> code) {
     line().append("\",\"code\":");
-    if (code)
-        appendJson(line(), *code);
-    else
-        line().append("null");
+    line().append(code ? std::to_string(*code) : "null");
 }
 
 void MessageLines::member(std::string_view name, const Value& value) {

@@ -10,7 +10,6 @@
 
 #include <functional>
 #include <map>
-#include <optional>
 #include <string>
 #include <unordered_map>
 #include <vector>
@@ -68,10 +67,12 @@ private:
     const NodeSelection& _selection;
     std::map<std::string, Places, std::less<>> _places; ///< by technology; with a selection only
     const Places* _current = nullptr;
+    JSONTexts _texts;
     std::unordered_map<const Base*, SectionText> _sections;
     std::unordered_map<std::uint32_t, JSONNode> _values; ///< of each code, as its latest message published
-    std::uint32_t _code = 0;                             ///< of the values of this message
-    std::optional<JSONFieldWriter> _valueWriter;         ///< while they are named
+    JSONFieldWriter _writer;
+    std::uint32_t _code = 0;    ///< of the values of this message
+    JSONNode* _named = nullptr; ///< its values, once they are named
     std::string _begin;
     std::string _technology; ///< the member, from the quote after the time on to that before the next comma
     Time _moment{};

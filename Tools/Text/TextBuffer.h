@@ -25,8 +25,8 @@ public:
     /// Precondition: `size` is not above size().
     void truncate(std::size_t size) { _size = size; }
 
-    /// Precondition: `index` is below size().
-    void replace(std::size_t index, char character) { _characters[index] = character; }
+    /// The character at that index, to be changed, or the one after all that there is room for.
+    [[nodiscard]] char* at(std::size_t index) { return _characters.get() + index; }
 
     void append(char character) {
         *room(1) = character;

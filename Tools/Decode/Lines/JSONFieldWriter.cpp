@@ -5,6 +5,7 @@
 
 #include "PropertyLists/Value.h"
 
+#include <bit>
 #include <stdexcept>
 
 namespace velmora {
@@ -14,28 +15,44 @@ namespace {
 /// What rows of lists are of.
 constexpr char row = 0;
 
+/// As Place::read, in fewer steps: the eight bytes that end with the field are one number. The first fields
+/// of a record have no eight.
+std::int64_t read(const Place& place, const Record& record) {
+    const std::size_t end = place.end();
+    constexpr std::size_t word = sizeof(std::uint64_t);
+    if (end < word || end > record.size() || place.isBigEndian)
+        return place.read(record);
+    const auto last = numberAt<std::uint64_t>(&record.bytes()[end - word], std::endian::little);
+    const unsigned above = static_cast<unsigned>(8 * (end - place.offset)) - place.bit - place.width;
+    const std::uint64_t top = last << above; // the field is the highest bits
+    const unsigned down = 64u - place.width;
+    return place.isSigned ? static_cast<std::int64_t>(top) >> down : static_cast<std::int64_t>(top >> down);
+}
+
 } // namespace
 
-JSONFieldWriter::JSONFieldWriter(JSONNode& node, Into into) : _into(into) {
+void JSONFieldWriter::begin(JSONNode& node, Into into) {
+    _into = into;
+    _depth = 0;
     _levels[0] = {&node, 0, into == Into::Values, !node.isArray()};
 }
 
 void JSONFieldWriter::end() {
-    if (level().isInOrder)
+    if (level().isOpen && level().isInOrder)
         level().node->truncate(level().next);
 }
 
-JSONMember* JSONFieldWriter::memberFor(const void* source, std::string_view label) {
+std::size_t JSONFieldWriter::memberFor(const void* source, std::string_view label) {
     Level& to = level();
     if (!to.isOpen)
-        return nullptr;
+        return nowhere;
     if (to.numbered)
-        return &to.node->memberAt(to.next++, nullptr, _entryKey);
+        return to.node->memberAt(to.next++, nullptr, _entryKey);
     if (to.node->isArray())
-        return &to.node->entryAt(to.next++, source);
+        return to.node->entryAt(to.next++, source);
     if (to.isInOrder)
-        return &to.node->memberAt(to.next++, source, label);
-    return &to.node->member(source, label);
+        return to.node->memberAt(to.next++, source, label);
+    return to.node->member(source, label);
 }
 
 void JSONFieldWriter::push(const Level& next) {
@@ -45,13 +62,23 @@ void JSONFieldWriter::push(const Level& next) {
 }
 
 void JSONFieldWriter::fields(const Record& record, const Layout& layout) {
-    for (const Field& field : layout.fields)
-        number(field, field.place.read(record));
+    Level& to = level();
+    if (!to.isOpen || to.numbered || to.node->isArray()) {
+        for (const Field& field : layout.fields)
+            number(field, field.place.read(record));
+        return;
+    }
+    JSONNode& node = *to.node;
+    for (const Field& field : layout.fields) {
+        const std::size_t index =
+            to.isInOrder ? node.memberAt(to.next++, &field, field.label) : node.member(&field, field.label);
+        node.setNumber(index, field, read(field.place, record));
+    }
 }
 
 void JSONFieldWriter::number(const Field& field, std::int64_t raw) {
-    if (JSONMember* const to = memberFor(&field, field.label))
-        to->setNumber(field, raw);
+    if (const std::size_t to = memberFor(&field, field.label); to != nowhere)
+        level().node->setNumber(to, field, raw);
 }
 
 void JSONFieldWriter::real(const Field& field, double value) {
@@ -59,13 +86,13 @@ void JSONFieldWriter::real(const Field& field, double value) {
 }
 
 void JSONFieldWriter::text(const Field& field, std::string_view text) {
-    if (JSONMember* const to = memberFor(&field, field.label))
-        to->setText(text);
+    if (const std::size_t to = memberFor(&field, field.label); to != nowhere)
+        level().node->setText(to, text);
 }
 
 void JSONFieldWriter::supplied(const Field& field, const Value& value) {
-    if (JSONMember* const to = memberFor(&field, field.label))
-        to->setValue(value);
+    if (const std::size_t to = memberFor(&field, field.label); to != nowhere)
+        level().node->setValue(to, value);
 }
 
 void JSONFieldWriter::removed(std::string_view label) {
@@ -91,20 +118,20 @@ void JSONFieldWriter::beginList(const List& list) {
         return;
     }
     const bool isNumbered = _into == Into::Values && list.entries == List::Entries::Numbered;
-    JSONMember* const member = to.isOpen && !to.node->isArray() ? memberFor(&list, list.label) : nullptr;
-    if (!member) {
+    if (!to.isOpen || to.node->isArray()) {
         push({});
         return;
     }
-    push({&member->setNode(!isNumbered), 0, true, true, isNumbered ? &list : nullptr, member});
+    const std::size_t member = memberFor(&list, list.label);
+    push({&to.node->setNode(member, !isNumbered), 0, true, true, isNumbered ? &list : nullptr, member});
     if (isNumbered)
-        level().node->memberAt(level().next++, nullptr, "_sorted").setText("_sorted");
+        level().node->setText(level().node->memberAt(level().next++, nullptr, "_sorted"), "_sorted");
 }
 
 void JSONFieldWriter::beginRow() {
     Level& to = level();
     const bool isShown = to.isOpen && to.node->isArray();
-    JSONNode* const node = isShown ? &to.node->entryAt(to.next++, &row).setNode(false) : nullptr;
+    JSONNode* const node = isShown ? &to.node->setNode(to.node->entryAt(to.next++, &row), false) : nullptr;
     push({node, 0, isShown, isShown});
 }
 
@@ -123,9 +150,10 @@ void JSONFieldWriter::entryNumber(std::size_t index, std::uint16_t number) {
 
 void JSONFieldWriter::endList() {
     end();
-    if (const List* const list = level().numbered; list && level().next == 1 && !list->whenEmpty.empty())
-        level().member->setText(list->whenEmpty);
+    const Level ended = level();
     --_depth;
+    if (ended.numbered && ended.next == 1 && !ended.numbered->whenEmpty.empty())
+        level().node->setText(ended.member, ended.numbered->whenEmpty);
 }
 
 } // namespace velmora

@@ -21,8 +21,8 @@ public:
         Values   ///< what is named is all that there is, in this order; numbered lists are dictionaries
     };
 
-    JSONFieldWriter(JSONNode& node, Into into);
-    /// Everything has been named.
+    /// What is named up to `end` is written into the node. It is begun again where naming was not completed.
+    void begin(JSONNode& node, Into into);
     void end();
 
     void fields(const Record& record, const Layout& layout) override;
@@ -48,17 +48,19 @@ private:
         bool isInOrder = false; ///< members are written one after another, from `next` on
         bool isOpen = false;    ///< fields are written here
         const List* numbered = nullptr;
-        JSONMember* member = nullptr; ///< of a numbered list
+        std::size_t member = 0; ///< of a numbered list, in the level above
     };
     /// As deep as a DisplayWriter's.
     static constexpr std::size_t deepest = 5;
 
     [[nodiscard]] Level& level() { return _levels[_depth]; }
     void push(const Level& next);
-    /// The member for what this constant names; null where it is ignored.
-    [[nodiscard]] JSONMember* memberFor(const void* source, std::string_view label);
+    static constexpr std::size_t nowhere = ~std::size_t{0};
 
-    Into _into;
+    /// The member for what this constant names; nowhere where it is ignored.
+    [[nodiscard]] std::size_t memberFor(const void* source, std::string_view label);
+
+    Into _into = Into::Section;
     std::array<Level, deepest> _levels;
     std::size_t _depth = 0;
     std::string _entryKey; ///< of the next entry of a numbered list

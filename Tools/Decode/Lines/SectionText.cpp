@@ -9,7 +9,8 @@
 
 namespace velmora {
 
-SectionText::SectionText(Base& section) : _section(section) {
+SectionText::SectionText(Base& section, JSONTexts& texts, JSONFieldWriter& writer)
+    : _section(section), _texts(texts), _writer(writer) {
     appendJsonString(_name, section.getSectionName());
     _name.append(':');
 }
@@ -34,15 +35,16 @@ void SectionText::update() {
         follow();
     } else {
         const Value node = _section.node();
-        _node.emplace(node.asArray() != nullptr);
+        _node.emplace(node.asArray() != nullptr, _texts);
         _node->read(node);
     }
     _changes = changes;
 }
 
 void SectionText::follow() {
-    JSONFieldWriter writer(*_node, JSONFieldWriter::Into::Section);
-    _section.nameLatest(writer);
+    _writer.begin(*_node, JSONFieldWriter::Into::Section);
+    _section.nameLatest(_writer);
+    _writer.end();
 }
 
 } // namespace velmora
