@@ -3,7 +3,9 @@
 
 #include "Tools/Browse/Data/MessageInspector.h"
 
+#include "LogGenerator/C2K/OneX/SubPackets.h"
 #include "LogMessages/LogMessage.h"
+#include "LogMessages/Record.h"
 #include "Platform/PrintableText.h"
 #include "Playback/QuietDecoding.h"
 
@@ -26,6 +28,17 @@ bool isLongBefore(Time earlier, Time later) {
                      static_cast<std::uint64_t>(earlier.time_since_epoch().count());
     constexpr std::chrono::nanoseconds old = MessageInspector::oldAge;
     return earlier < later && age > static_cast<std::uint64_t>(old.count());
+}
+
+/// Where a record or its sub-packet of that id, 0 for none, begins in the message.
+std::optional<std::size_t> beginOfTable(const LogMessage& message, std::uint8_t subPacket) {
+    const std::size_t begin = message.prefixed ? LogMessage::prefixLength : 0;
+    if (subPacket == 0)
+        return begin;
+    if (message.record.size() < C2K::SubPackets::minimumLength)
+        return std::nullopt;
+    const C2K::FoundSubPacket found = C2K::SubPackets(Record(message.record)).find(subPacket);
+    return found.found() ? std::optional(begin + found.offset) : std::nullopt;
 }
 
 } // namespace
@@ -92,6 +105,7 @@ const InspectedMessage* MessageInspector::inspect(std::uint64_t position) {
     _isWanted = false;
     if (!isTaken)
         return nullptr;
+    _probed.find(_inspected.message, _inspected.fields);
     _inspected.rows = displayRows(_decoder->display());
     markChanges(_inspected.rows, before);
     addAges();
@@ -127,9 +141,8 @@ std::optional<FieldPlace> MessageInspector::placeOf(const Observation& observati
     const Bytes bytes = _inspected.message.message.bytes();
     const Place& place = observation.source->field->place;
     std::optional<std::size_t> begin = places.find(*observation.source->field, observation.rows);
-    if (!begin && !observation.source->list && observation.source->subPacket == 0)
-        if (const std::optional<LogMessage> parsed = LogMessage::parse(bytes))
-            begin = parsed->prefixed ? LogMessage::prefixLength : 0;
+    if (const auto parsed = LogMessage::parse(bytes); parsed && !begin && !observation.source->list)
+        begin = beginOfTable(*parsed, observation.source->subPacket);
     if (!begin || *begin + place.end() > bytes.size())
         return std::nullopt;
     return FieldPlace{*begin + place.offset, *begin + place.end(), place.bit, place.width};

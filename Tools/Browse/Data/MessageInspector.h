@@ -9,6 +9,7 @@
 #include "Tools/Browse/Data/FieldPlaces.h"
 #include "Tools/Browse/Data/InspectedMessage.h"
 #include "Tools/Browse/Data/MessageCursor.h"
+#include "Tools/Browse/Data/ProbedPlaces.h"
 
 #include <chrono>
 #include <cstdint>
@@ -27,7 +28,8 @@ public:
     static constexpr std::chrono::seconds oldAge{10};
 
     /// The file must outlive it.
-    explicit MessageInspector(const BrowsedFile& file) : _file(file), _cursor(file) {}
+    explicit MessageInspector(const BrowsedFile& file)
+        : _file(file), _cursor(file), _probed(file.index().technology()) {}
     ~MessageInspector() override;
 
     /// Null where the message cannot be read (see `failure`). Valid until the next call.
@@ -46,6 +48,7 @@ private:
 
     const BrowsedFile& _file;
     MessageCursor _cursor;
+    ProbedPlaces _probed;
     std::unique_ptr<PlayedDecoder> _decoder;
     Time _beginning{};         ///< what was not reported since the decoder began is older than this
     std::vector<Time> _latest; ///< by index of the leaf; the beginning for none since then
