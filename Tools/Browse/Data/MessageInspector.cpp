@@ -43,31 +43,13 @@ std::optional<std::size_t> beginOfTable(const LogMessage& message, std::uint8_t 
 
 } // namespace
 
-MessageInspector::~MessageInspector() {
-    if (_decoder)
-        _decoder->decoder().setObservationSink(nullptr);
-}
-
 bool MessageInspector::begin(std::uint64_t position) {
-    const RecordingIndex::Checkpoint& checkpoint =
-        _file.index().beforeMessage(position - std::min(position, lead));
-    if (_decoder && _decoder->messages() <= position && checkpoint.messages() <= _decoder->messages())
-        return true;
-    if (_decoder)
-        _decoder->decoder().setObservationSink(nullptr);
-    const std::string& technology = _file.index().technology();
-    Result<std::unique_ptr<PlayedDecoder>> decoder =
-        checkpoint.decoder ? PlayedDecoder::make(technology, {}, *checkpoint.decoder)
-                           : PlayedDecoder::make(technology, {});
-    if (!decoder) {
-        _failure = decoder.reason();
-        return false;
-    }
-    _decoder = *std::move(decoder);
-    _beginning = checkpoint.latest;
-    _latest.clear();
-    _decoder->decoder().setObservationSink(this);
-    return true;
+    const Result<bool> isNew = _decoder.standBefore(position, lead);
+    if (!isNew)
+        _failure = isNew.reason();
+    else if (*isNew)
+        _latest.clear();
+    return static_cast<bool>(isNew);
 }
 
 bool MessageInspector::takeNext() {
@@ -164,7 +146,7 @@ void MessageInspector::addAges() {
         const bool isKnown = leaf->index < _latest.size() && _latest[leaf->index] != Time::min();
         if (isKnown)
             row.latest = _latest[leaf->index];
-        const Time latest = row.latest.value_or(_beginning);
+        const Time latest = row.latest.value_or(_decoder.beginning());
         row.isOld = isLongBefore(latest, now);
     }
 }
