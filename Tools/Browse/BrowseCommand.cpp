@@ -49,8 +49,8 @@ int runBrowse(const BrowseOptions& options, Output& output) {
         return ExitStatus::BadInput;
     }
     LazyRules rules;
-    const Browser::Open open = [&](const std::string& path) {
-        return BrowseSession::open(path, options.technology, *masking,
+    const Browser::Open open = [&](const std::string& path, const std::string& technology) {
+        return BrowseSession::open(path, technology.empty() ? options.technology : technology, *masking,
                                    [&rules]() -> const RuleSet& { return rules.get(); });
     };
     if (options.byLine)

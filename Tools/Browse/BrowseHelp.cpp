@@ -19,7 +19,7 @@ std::vector<std::string> browseHelp() {
         " v      begin a range that ends with the chosen message; again: no range",
         " w      write the range, or all, with the notes, to a new recording",
         " y      copy the row, the value or the bytes to the terminal's clipboard",
-        " > <    the next or previous file",
+        " > <    the next or previous file,  T  the next technology of the file",
         " Ctrl-L draw again,  Ctrl-Z  stop the program,  q  quit",
         "",
         " > chosen   * changed by this message   = reported by it unchanged   | in the range",

@@ -21,8 +21,8 @@ CLI::App* addBrowse(CLI::App& app, BrowseOptions& options) {
     command->footer(
         "Keys: arrows, PgUp, PgDn, Home and End move, Tab goes to the next part, / n N search,\n"
         "f filters by a condition as rules have them or by log codes, e E go to events, t to a\n"
-        "time, m writes a note, v marks a range, w writes it to a new recording, y copies, ? lists\n"
-        "all keys, q quits. The files are never changed.\n\n"
+        "time, m writes a note, v marks a range, w writes it to a new recording, y copies, T shows the\n"
+        "next technology of the file, ? lists all keys, q quits. The files are never changed.\n\n"
         "Colours are left out where NO_COLOR is set.\n\n"
         "With --mask everything is masked: the bytes and the recordings that w writes as well as values. "
         "Notes\n"

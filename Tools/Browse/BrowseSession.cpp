@@ -203,7 +203,7 @@ std::vector<MessageRow> BrowseSession::rows(std::uint64_t first, std::size_t cou
             row.name = _file->nameOf(*row.code);
         }
         row.note = note(*position);
-        if (const std::string comments = _cursor.comments(*message); !comments.empty())
+        if (const std::string& comments = _cursor.comments(); !comments.empty())
             row.note += (row.note.empty() ? "" : "; ") + printable(comments);
         row.isMarked = range && *position >= range->first && *position <= range->second;
         rows.push_back(std::move(row));
@@ -261,6 +261,16 @@ std::optional<std::pair<std::uint64_t, std::uint64_t>> BrowseSession::marked() c
     if (!_mark)
         return std::nullopt;
     return std::minmax(*_mark, _position);
+}
+
+std::vector<std::string> BrowseSession::otherTechnologies() const {
+    std::vector<std::string> names = _file->file().reader().technologies();
+    const auto own = std::find(names.begin(), names.end(), _file->index().technology());
+    if (own == names.end())
+        return {}; // the messages are taken as another one's
+    std::rotate(names.begin(), own, names.end());
+    names.erase(names.begin());
+    return names;
 }
 
 Result<std::uint64_t> BrowseSession::write(const std::string& path) {

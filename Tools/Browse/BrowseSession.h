@@ -77,6 +77,10 @@ public:
     /// Writes the marked range, or all, with the notes, to a new recording. Returns how many messages.
     Result<std::uint64_t> write(const std::string& path);
 
+    /// The technologies of which the file has messages, as far as it has been read, from the one after this
+    /// session's on; empty where that is the only one.
+    [[nodiscard]] std::vector<std::string> otherTechnologies() const;
+
     [[nodiscard]] const BrowsedFile& file() const { return *_file; }
     /// Null until the file has been read.
     [[nodiscard]] const EventPass* events() const { return _events.get(); }

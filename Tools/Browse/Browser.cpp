@@ -21,15 +21,19 @@ Result<std::unique_ptr<Browser>> Browser::make(std::vector<std::string> files, O
 }
 
 Browser::Browser(std::vector<std::string> files, Open open, Host host)
-    : _files(std::move(files)), _open(std::move(open)), _host(std::move(host)), _sessions(_files.size()) {}
+    : _files(std::move(files)), _open(std::move(open)), _host(std::move(host)), _opened(_files.size()) {}
 
-Result<Done> Browser::openFile(std::size_t index) {
-    if (!_sessions[index]) {
-        Result<std::unique_ptr<BrowseSession>> session = _open(_files[index]);
+Result<Done> Browser::openFile(std::size_t index, const std::string& technology) {
+    OpenedFile& file = _opened[index];
+    std::string name = technology.empty() ? file.technology : technology;
+    if (!file.sessions.contains(name)) {
+        Result<std::unique_ptr<BrowseSession>> session = _open(_files[index], technology);
         if (!session)
             return Failure{_files[index] + ": " + session.reason()};
-        _sessions[index] = *std::move(session);
+        name = (*session)->file().index().technology();
+        file.sessions[name] = *std::move(session);
     }
+    file.technology = std::move(name);
     _file = index;
     return Done{};
 }
@@ -107,6 +111,7 @@ void Browser::takeLetter(char letter) {
         break;
     case ']': changeSection(1); break;
     case '[': changeSection(-1); break;
+    case 'T': changeTechnology(); break;
     case '>': changeFile(1); break;
     case '<': changeFile(-1); break;
     default: _news = "? shows the keys"; break;
@@ -199,6 +204,24 @@ void Browser::changeFile(int step) {
     }
     if (const Result<Done> opened = openFile(next); !opened)
         _news = printable(opened.reason());
+}
+
+/// At the same time as before.
+void Browser::changeTechnology() {
+    const std::vector<std::string> others = session().otherTechnologies();
+    const InspectedMessage* const message = session().message();
+    const std::optional<Time> time = message ? std::optional(message->message.time) : std::nullopt;
+    _news = "no other technology in the file";
+    for (const std::string& name : others) {
+        // There may be some without a decoder.
+        const Result<Done> opened = openFile(_file, name);
+        _news = opened ? std::string() : printable(opened.reason());
+        if (!opened)
+            continue;
+        if (time)
+            session().chooseTime(*time);
+        return;
+    }
 }
 
 void Browser::changeSection(int step) {

@@ -11,6 +11,7 @@
 
 #include <cstddef>
 #include <functional>
+#include <map>
 #include <memory>
 #include <optional>
 #include <string>
@@ -26,8 +27,9 @@ public:
         std::function<void()> quit;
         std::function<void(const std::string& text)> copy; ///< to the terminal's clipboard
     };
-    /// Opens a file of the command line.
-    using Open = std::function<Result<std::unique_ptr<BrowseSession>>(const std::string& path)>;
+    /// Opens a file of the command line. `technology`: its short name; empty for the one of the command line.
+    using Open = std::function<Result<std::unique_ptr<BrowseSession>>(const std::string& path,
+                                                                      const std::string& technology)>;
 
     /// Fails where the first file cannot be opened.
     static Result<std::unique_ptr<Browser>> make(std::vector<std::string> files, Open open, Host host);
@@ -36,11 +38,17 @@ public:
     /// Goes on with what takes long. Whether there is more to do.
     bool work();
     [[nodiscard]] BrowseView view(ScreenSize size);
-    [[nodiscard]] BrowseSession& session() { return *_sessions[_file]; }
+    [[nodiscard]] BrowseSession& session() { return *_opened[_file].sessions.at(_opened[_file].technology); }
 
 private:
+    /// A file of the command line, opened when it is first shown.
+    struct OpenedFile {
+        std::string technology;                                         ///< that is shown
+        std::map<std::string, std::unique_ptr<BrowseSession>> sessions; ///< by technology
+    };
+
     Browser(std::vector<std::string> files, Open open, Host host);
-    Result<Done> openFile(std::size_t index);
+    Result<Done> openFile(std::size_t index, const std::string& technology = {});
 
     void takeCommand(const KeyPress& press, ScreenSize size);
     void takeLetter(char letter);
@@ -49,6 +57,7 @@ private:
     void moveInBytes(Key key, std::size_t perLine, std::size_t page);
     void changePart(int step);
     void changeFile(int step);
+    void changeTechnology();
     void changeSection(int step);
     void ask(std::string question, std::string text, std::function<void(const std::string&)> done);
     void askFilter();
@@ -69,7 +78,7 @@ private:
     std::vector<std::string> _files;
     Open _open;
     Host _host;
-    std::vector<std::unique_ptr<BrowseSession>> _sessions; ///< by file; null where it has not been opened
+    std::vector<OpenedFile> _opened; ///< by file
     std::size_t _file = 0;
     BrowsePart _part = BrowsePart::Messages;
     std::optional<Prompt> _prompt;

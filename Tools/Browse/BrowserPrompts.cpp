@@ -89,8 +89,9 @@ void Browser::copy() {
 
 void Browser::quit() {
     bool hasNotes = false;
-    for (const std::unique_ptr<BrowseSession>& each : _sessions)
-        hasNotes = hasNotes || (each && each->hasUnwrittenNotes());
+    for (const OpenedFile& file : _opened)
+        for (const auto& [technology, each] : file.sessions)
+            hasNotes = hasNotes || each->hasUnwrittenNotes();
     if (hasNotes && !std::exchange(_isLeaving, true))
         _news = "notes are not written: w writes them to a copy, q again leaves without them";
     else

@@ -25,7 +25,7 @@ constexpr std::string_view help =
     "/TEXT: search, n: again, N: backwards   f CONDITION or CODES: filter, f alone: all\n"
     "e, E: next, previous event   t TIME: go there   m TEXT: a note, m alone: none\n"
     "v: begin or drop a range   w FILE: write it to a new recording\n"
-    ">, <: next, previous file   ?: this list   q: quit\n";
+    ">, <: next, previous file   T: the next technology of the file   ?: this list   q: quit\n";
 
 } // namespace
 
@@ -38,8 +38,8 @@ void LineBrowser::print(const Result<Done>& result) {
         print(printable(result.reason()));
 }
 
-bool LineBrowser::openFile(std::size_t index) {
-    Result<std::unique_ptr<BrowseSession>> session = _open(_files[index]);
+bool LineBrowser::openFile(std::size_t index, const std::string& technology) {
+    Result<std::unique_ptr<BrowseSession>> session = _open(_files[index], technology);
     if (!session) {
         report(_files[index] + ": " + session.reason());
         return false;
@@ -106,6 +106,7 @@ bool LineBrowser::take(std::string_view line) {
         print(written ? std::to_string(*written) + " messages written" : printable(written.reason()));
         return true;
     }
+    case 'T': changeTechnology(); return true;
     case '>':
     case '<': {
         const std::size_t next = command == '>' ? _file + 1 : _file - 1;
@@ -128,6 +129,13 @@ bool LineBrowser::take(std::string_view line) {
         print("the last message");
     printMessage();
     return true;
+}
+
+void LineBrowser::changeTechnology() {
+    for (const std::string& name : _session->otherTechnologies())
+        if (openFile(_file, name))
+            return;
+    print("no other technology in the file");
 }
 
 void LineBrowser::find(const std::string& text, SearchPass::Direction direction) {

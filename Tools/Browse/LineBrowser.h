@@ -25,7 +25,8 @@ public:
     int run();
 
 private:
-    [[nodiscard]] bool openFile(std::size_t index);
+    [[nodiscard]] bool openFile(std::size_t index, const std::string& technology = {});
+    void changeTechnology();
     /// False for q.
     bool take(std::string_view line);
     void find(const std::string& text, SearchPass::Direction direction);

@@ -91,6 +91,15 @@ TEST_F(LineBrowserTest, WritesTheRangeWithItsNotesAndLeavesTheInput) {
     EXPECT_EQ(contentOf("drive.pcapng"), before);
 }
 
+TEST_F(LineBrowserTest, PrintsTheBytes) {
+    // Type, length, code and time stamp, then the state.
+    EXPECT_THAT(answers("h\n"), testing::StartsWith("0110002c51000000000000000004"));
+}
+
+TEST_F(LineBrowserTest, SaysThatAFileHasOneTechnology) {
+    EXPECT_THAT(answers("T\n"), EndsWith("no other technology in the file\n"));
+}
+
 TEST_F(LineBrowserTest, HostileTextsAreEscaped) {
     EXPECT_THAT(answers("m \x1b[2J\xff\nb\n"), Not(HasSubstr("\x1b")));
     EXPECT_THAT(answers("/\x1b]0;x\x07\n"), HasSubstr("no later message has \"\\x1B]0;x\\x07\""));

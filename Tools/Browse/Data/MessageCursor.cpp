@@ -24,6 +24,11 @@ std::optional<LoggedMessage> MessageCursor::next() {
     while (message && !_file.index().has(*message))
         message = _reader->next();
     ++_next;
+    // Taken with each message, since a reader keeps but the first ones.
+    _comments.clear();
+    for (const Comment& each : _reader->takeNewComments())
+        if (message && each.about == Comment::About::Message && each.number == message->number)
+            _comments += (_comments.empty() ? "" : "; ") + each.text;
     return message;
 }
 
@@ -44,14 +49,6 @@ std::optional<LoggedMessage> MessageCursor::at(std::uint64_t position) {
         _reader.reset();
     }
     return message;
-}
-
-std::string MessageCursor::comments(const LoggedMessage& message) const {
-    std::string text;
-    for (const Comment& each : _reader->comments().first())
-        if (each.about == Comment::About::Message && each.number == message.number)
-            text += (text.empty() ? "" : "; ") + each.text;
-    return text;
 }
 
 } // namespace velmora

@@ -23,7 +23,7 @@ public:
     /// Absent where it has not been read yet, and where it cannot be read any more (see `failure`).
     [[nodiscard]] std::optional<LoggedMessage> at(std::uint64_t position);
     /// The comments of the recording on the message that `at` last returned, joined by "; ".
-    [[nodiscard]] std::string comments(const LoggedMessage& message) const;
+    [[nodiscard]] const std::string& comments() const { return _comments; }
     [[nodiscard]] const std::string& failure() const { return _failure; }
 
 private:
@@ -33,6 +33,7 @@ private:
     const BrowsedFile& _file;
     std::unique_ptr<MessageReader> _reader;
     std::uint64_t _next = 0; ///< the position of the message that the reader returns next
+    std::string _comments;
     std::string _failure;
 };
 

@@ -3,7 +3,9 @@
 
 #include "Tools/Browse/Data/MessageInspector.h"
 
+#include "LogGenerator/C2K/OneX/SubPackets.h"
 #include "LogMessages/LogMessage.h"
+#include "LogMessages/Record.h"
 #include "Platform/PrintableText.h"
 #include "Playback/QuietDecoding.h"
 
@@ -28,33 +30,26 @@ bool isLongBefore(Time earlier, Time later) {
     return earlier < later && age > static_cast<std::uint64_t>(old.count());
 }
 
-} // namespace
-
-MessageInspector::~MessageInspector() {
-    if (_decoder)
-        _decoder->decoder().setObservationSink(nullptr);
+/// Where a record or its sub-packet of that id, 0 for none, begins in the message.
+std::optional<std::size_t> beginOfTable(const LogMessage& message, std::uint8_t subPacket) {
+    const std::size_t begin = message.prefixed ? LogMessage::prefixLength : 0;
+    if (subPacket == 0)
+        return begin;
+    if (message.record.size() < C2K::SubPackets::minimumLength)
+        return std::nullopt;
+    const C2K::FoundSubPacket found = C2K::SubPackets(Record(message.record)).find(subPacket);
+    return found.found() ? std::optional(begin + found.offset) : std::nullopt;
 }
 
+} // namespace
+
 bool MessageInspector::begin(std::uint64_t position) {
-    const RecordingIndex::Checkpoint& checkpoint =
-        _file.index().beforeMessage(position - std::min(position, lead));
-    if (_decoder && _decoder->messages() <= position && checkpoint.messages() <= _decoder->messages())
-        return true;
-    if (_decoder)
-        _decoder->decoder().setObservationSink(nullptr);
-    const std::string& technology = _file.index().technology();
-    Result<std::unique_ptr<PlayedDecoder>> decoder =
-        checkpoint.decoder ? PlayedDecoder::make(technology, {}, *checkpoint.decoder)
-                           : PlayedDecoder::make(technology, {});
-    if (!decoder) {
-        _failure = decoder.reason();
-        return false;
-    }
-    _decoder = *std::move(decoder);
-    _beginning = checkpoint.latest;
-    _latest.clear();
-    _decoder->decoder().setObservationSink(this);
-    return true;
+    const Result<bool> isNew = _decoder.standBefore(position, lead);
+    if (!isNew)
+        _failure = isNew.reason();
+    else if (*isNew)
+        _latest.clear();
+    return static_cast<bool>(isNew);
 }
 
 bool MessageInspector::takeNext() {
@@ -92,6 +87,7 @@ const InspectedMessage* MessageInspector::inspect(std::uint64_t position) {
     _isWanted = false;
     if (!isTaken)
         return nullptr;
+    _probed.find(_inspected.message, _inspected.fields);
     _inspected.rows = displayRows(_decoder->display());
     markChanges(_inspected.rows, before);
     addAges();
@@ -127,9 +123,8 @@ std::optional<FieldPlace> MessageInspector::placeOf(const Observation& observati
     const Bytes bytes = _inspected.message.message.bytes();
     const Place& place = observation.source->field->place;
     std::optional<std::size_t> begin = places.find(*observation.source->field, observation.rows);
-    if (!begin && !observation.source->list && observation.source->subPacket == 0)
-        if (const std::optional<LogMessage> parsed = LogMessage::parse(bytes))
-            begin = parsed->prefixed ? LogMessage::prefixLength : 0;
+    if (const auto parsed = LogMessage::parse(bytes); parsed && !begin && !observation.source->list)
+        begin = beginOfTable(*parsed, observation.source->subPacket);
     if (!begin || *begin + place.end() > bytes.size())
         return std::nullopt;
     return FieldPlace{*begin + place.offset, *begin + place.end(), place.bit, place.width};
@@ -151,7 +146,7 @@ void MessageInspector::addAges() {
         const bool isKnown = leaf->index < _latest.size() && _latest[leaf->index] != Time::min();
         if (isKnown)
             row.latest = _latest[leaf->index];
-        const Time latest = row.latest.value_or(_beginning);
+        const Time latest = row.latest.value_or(_decoder.beginning());
         row.isOld = isLongBefore(latest, now);
     }
 }

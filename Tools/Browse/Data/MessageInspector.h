@@ -4,15 +4,15 @@
 #pragma once
 
 #include "LogGenerator/Observations/Observation.h"
-#include "Playback/PlayedDecoder.h"
 #include "Tools/Browse/Data/BrowsedFile.h"
 #include "Tools/Browse/Data/FieldPlaces.h"
 #include "Tools/Browse/Data/InspectedMessage.h"
 #include "Tools/Browse/Data/MessageCursor.h"
+#include "Tools/Browse/Data/PositionedDecoder.h"
+#include "Tools/Browse/Data/ProbedPlaces.h"
 
 #include <chrono>
 #include <cstdint>
-#include <memory>
 #include <string>
 #include <vector>
 
@@ -27,8 +27,8 @@ public:
     static constexpr std::chrono::seconds oldAge{10};
 
     /// The file must outlive it.
-    explicit MessageInspector(const BrowsedFile& file) : _file(file), _cursor(file) {}
-    ~MessageInspector() override;
+    explicit MessageInspector(const BrowsedFile& file)
+        : _file(file), _cursor(file), _probed(file.index().technology()), _decoder(file, *this) {}
 
     /// Null where the message cannot be read (see `failure`). Valid until the next call.
     [[nodiscard]] const InspectedMessage* inspect(std::uint64_t position);
@@ -46,8 +46,8 @@ private:
 
     const BrowsedFile& _file;
     MessageCursor _cursor;
-    std::unique_ptr<PlayedDecoder> _decoder;
-    Time _beginning{};         ///< what was not reported since the decoder began is older than this
+    ProbedPlaces _probed;
+    PositionedDecoder _decoder;
     std::vector<Time> _latest; ///< by index of the leaf; the beginning for none since then
     bool _isWanted = false;    ///< the message that is being decoded is the one to be taken apart
     InspectedMessage _inspected;

@@ -22,38 +22,16 @@ void fold(std::string& text) {
 } // namespace
 
 SearchPass::SearchPass(const BrowsedFile& file, Query query)
-    : _file(file), _query(std::move(query)), _cursor(file),
+    : _file(file), _query(std::move(query)), _cursor(file), _decoder(file, *this),
       _begin(_query.direction == Direction::Forward ? _query.from + 1 : _query.from) {
     fold(_query.text);
-}
-
-SearchPass::~SearchPass() {
-    if (_decoder)
-        _decoder->decoder().setObservationSink(nullptr);
-}
-
-bool SearchPass::begin(std::uint64_t position) {
-    const RecordingIndex::Checkpoint& checkpoint = _file.index().beforeMessage(position);
-    if (_decoder && _decoder->messages() <= position && checkpoint.messages() <= _decoder->messages())
-        return true;
-    if (_decoder)
-        _decoder->decoder().setObservationSink(nullptr);
-    const std::string& technology = _file.index().technology();
-    Result<std::unique_ptr<PlayedDecoder>> decoder =
-        checkpoint.decoder ? PlayedDecoder::make(technology, {}, *checkpoint.decoder)
-                           : PlayedDecoder::make(technology, {});
-    if (!decoder)
-        return false;
-    _decoder = *std::move(decoder);
-    _decoder->decoder().setObservationSink(this);
-    return true;
 }
 
 bool SearchPass::step() {
     const QuietDecoding quiet;
     if (_query.direction == Direction::Forward) {
         const std::uint64_t end = std::min(_begin + 2048, _file.messages());
-        if (_begin >= end || !begin(_begin))
+        if (_begin >= end || !_decoder.standBefore(_begin))
             return false;
         searchTo(end);
         _begin = std::max(end, _begin + 1);
@@ -63,7 +41,7 @@ bool SearchPass::step() {
         return false;
     const std::uint64_t end = _begin;
     _begin = _file.index().beforeMessage(end - 1).messages();
-    if (!begin(_begin))
+    if (!_decoder.standBefore(_begin))
         return false;
     searchTo(end);
     return !_found && _begin > 0;
@@ -94,7 +72,7 @@ bool SearchPass::has(std::string text) const {
 }
 
 bool SearchPass::isMatch(const LoggedMessage& message, std::uint64_t position) {
-    if (has(_cursor.comments(message)) || (_query.noteOf && has(_query.noteOf(position))))
+    if (has(_cursor.comments()) || (_query.noteOf && has(_query.noteOf(position))))
         return true;
     const std::optional<LogMessage> parsed = LogMessage::parse(message.message.bytes());
     return parsed && has(_file.nameOf(parsed->logCode()));

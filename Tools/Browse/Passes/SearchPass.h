@@ -4,13 +4,12 @@
 #pragma once
 
 #include "LogGenerator/Observations/Observation.h"
-#include "Playback/PlayedDecoder.h"
 #include "Tools/Browse/Data/BrowsedFile.h"
 #include "Tools/Browse/Data/MessageCursor.h"
+#include "Tools/Browse/Data/PositionedDecoder.h"
 
 #include <cstdint>
 #include <functional>
-#include <memory>
 #include <optional>
 #include <string>
 
@@ -33,7 +32,6 @@ public:
 
     /// The file must outlive it.
     SearchPass(const BrowsedFile& file, Query query);
-    ~SearchPass() override;
     SearchPass(const SearchPass&) = delete;
     SearchPass& operator=(const SearchPass&) = delete;
 
@@ -47,7 +45,6 @@ public:
 private:
     void observed(const ObservedMessage& message) override;
     [[nodiscard]] bool wantsRowKeys() const override { return false; }
-    [[nodiscard]] bool begin(std::uint64_t position);
     void searchTo(std::uint64_t end);
     [[nodiscard]] bool has(std::string text) const;
     [[nodiscard]] bool isMatch(const LoggedMessage& message, std::uint64_t position);
@@ -55,7 +52,7 @@ private:
     const BrowsedFile& _file;
     Query _query;
     MessageCursor _cursor;
-    std::unique_ptr<PlayedDecoder> _decoder;
+    PositionedDecoder _decoder;
     std::uint64_t _begin; ///< forward: all before it is done; backward: all from it on
     bool _isReported = false;
     ObservedText _text;
