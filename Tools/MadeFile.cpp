@@ -40,7 +40,8 @@ bool makeFile(const MadeFile& file, const std::filesystem::path& target,
     const RemovedWhenInterrupted removed(output->path());
     const Result<bool> written = write(*output, context);
     if (!written) {
-        report(written.reason());
+        if (!written.reason().empty())
+            report(written.reason());
         return false;
     }
     using IfExists = AtomicFile::IfExists;

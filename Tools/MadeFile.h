@@ -15,9 +15,9 @@
 
 namespace velmora {
 
-/// The file that a command makes of another one.
+/// The file that a command makes.
 struct MadeFile {
-    std::string in;     ///< "-" is standard input
+    std::string in;     ///< what it is made of: "-" is standard input; empty for several files
     std::string out;    ///< as the user names it
     bool force = false; ///< whether it may replace a file
 };
@@ -30,7 +30,8 @@ struct MadeFile {
 
 /// Makes the file at `target`, which appears when it is complete and never in part: neither after a failure
 /// nor after an interruption by the user. `write` returns whether all of the input has been written. What
-/// fails is reported. Returns whether all of the input is in the file now.
+/// fails is reported, but for a failure without a reason, which has been. Returns whether all of the input is
+/// in the file now.
 [[nodiscard]] bool makeFile(const MadeFile& file, const std::filesystem::path& target,
                             const std::function<Result<bool>(AtomicFile&, WorkContext&)>& write);
 

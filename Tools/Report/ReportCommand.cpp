@@ -4,11 +4,11 @@
 #include "Tools/Report/ReportCommand.h"
 
 #include "Export/Tracks/TrackCollector.h"
-#include "Platform/Linux/Files/AtomicFile.h"
 #include "Recorder/OverwriteTarget.h"
 #include "Tools/Analysed/AnalysedFiles.h"
 #include "Tools/ExitStatus.h"
 #include "Tools/Log/DecoderLog.h"
+#include "Tools/MadeFile.h"
 #include "Tools/Output.h"
 #include "Tools/OutputGuard.h"
 #include "Tools/Report.h"
@@ -19,13 +19,9 @@
 #include <filesystem>
 #include <optional>
 
-#include <sys/stat.h>
-
 namespace velmora {
 
 namespace {
-
-constexpr mode_t newFileMode = S_IRUSR | S_IWUSR;
 
 /// The names of the files on the page: without directories, which are private; numbered where several are the
 /// same.
@@ -61,35 +57,19 @@ bool readFiles(const ReportOptions& options, const std::optional<MaskOptions>& m
     return analyseFiles(input, feed, lines);
 }
 
-bool writePage(const DriveReport& page, const ReportOptions& options, AtomicFile& file) {
+Result<Done> writePage(const DriveReport& page, const ReportOptions& options, const AtomicFile& file) {
     Output output(file.descriptor(), options.out);
     page.write([&output](std::string_view text) { output.put(text); });
     output.flush();
     if (!output.isOpen())
-        return false;
-    using IfExists = AtomicFile::IfExists;
-    const auto committed = file.commit(options.force ? IfExists::Replace : IfExists::Refuse);
-    if (!committed)
-        report(options.out + ": " + committed.reason());
-    return static_cast<bool>(committed);
+        return Failure{}; // which the output has reported
+    return Done();
 }
 
 /// Whether all of the input is on the page now.
-bool makePage(const ReportOptions& options, const RuleSet& rules, const std::optional<MaskOptions>& masking,
-              const std::filesystem::path& target, DecoderLines& lines) {
-    // Before the page, so that an allocation that fails never leaves one on the disk.
-    AtomicFile* made = nullptr;
-    const WorkContext context({}, [&made] {
-        if (made)
-            made->discard();
-    });
-    Result<AtomicFile> file = AtomicFile::create(target, newFileMode);
-    if (!file) {
-        report(options.out + ": " + file.reason());
-        return false;
-    }
-    made = &*file;
-    const RemovedWhenInterrupted removed(file->path());
+Result<bool> makePage(const ReportOptions& options, const RuleSet& rules,
+                      const std::optional<MaskOptions>& masking, DecoderLines& lines,
+                      const AtomicFile& file) {
     DriveReport::Options setup;
     setup.files = shownNames(options.files);
     setup.rules = &rules;
@@ -103,7 +83,9 @@ bool makePage(const ReportOptions& options, const RuleSet& rules, const std::opt
     page.emplace(std::move(setup));
     const bool good = readFiles(options, masking, *page, feed, lines);
     page->finish();
-    return writePage(*page, options, *file) && good;
+    if (const Result<Done> written = writePage(*page, options, file); !written)
+        return Failure{written.reason()};
+    return good;
 }
 
 } // namespace
@@ -135,8 +117,13 @@ int runReport(const ReportOptions& options, DecoderLines& lines) {
         good =
             good && std::find(options.rules.begin(), options.rules.end(), error.file) == options.rules.end();
     }
-    return good && makePage(options, rules, *masking, *target, lines) ? ExitStatus::Done
-                                                                      : ExitStatus::BadInput;
+    if (!good)
+        return ExitStatus::BadInput;
+    const MadeFile page{{}, options.out, options.force}; // of several files, which failures name
+    const bool isWhole = makeFile(page, *target, [&](const AtomicFile& file, WorkContext&) {
+        return makePage(options, rules, *masking, lines, file);
+    });
+    return isWhole ? ExitStatus::Done : ExitStatus::BadInput;
 }
 
 } // namespace velmora

@@ -26,7 +26,8 @@ bool isAnyTouched(std::span<const std::uint32_t> slots, const InputStore& inputs
 } // namespace
 
 BoundExpression::BoundExpression(const Expression& expression, InputStore& inputs)
-    : _expression(&expression), _windowValues(expression.windows.size()), _columns(expression) {
+    : _expression(&expression), _windowValues(expression.windows.size()), _columns(expression),
+      _kept(expression) {
     for (const RuleInput& each : expression.inputs)
         _slots.push_back(inputs.add(each));
     for (const ExpressionWindow& each : expression.windows) {
@@ -43,7 +44,7 @@ RuleValue BoundExpression::evaluate(const InputStore& inputs, Wakeup& wakeup) {
             updateDelta(i, inputs, wakeup);
         else
             updateCount(i, inputs, wakeup);
-    return Evaluator(*_expression, _slots, inputs, _windowValues, _columns, wakeup).value();
+    return Evaluator(*_expression, _slots, inputs, _windowValues, _columns, _kept, wakeup).value();
 }
 
 void BoundExpression::clear() {
@@ -86,7 +87,7 @@ void BoundExpression::updateCount(std::size_t index, const InputStore& inputs, W
     Window& window = _windows[index];
     if (isAnyTouched(window.slots, inputs)) {
         const std::uint32_t operand = _expression->nodes[_expression->windows[index].node].first;
-        Evaluator evaluator(*_expression, _slots, inputs, _windowValues, _columns, wakeup);
+        Evaluator evaluator(*_expression, _slots, inputs, _windowValues, _columns, _kept, wakeup);
         if (evaluator.evaluate(operand).isTrue()) {
             if (window.samples.size() == mostSamples)
                 window.samples.pop_front();

@@ -5,6 +5,7 @@
 
 #include "Analysis/Rules/Evaluation/ColumnEvaluator.h"
 #include "Analysis/Rules/Evaluation/InputStore.h"
+#include "Analysis/Rules/Evaluation/KeptComparisons.h"
 #include "Analysis/Rules/Evaluation/RuleValue.h"
 #include "Analysis/Rules/Evaluation/Wakeup.h"
 #include "Analysis/Rules/Expression/Expression.h"
@@ -49,6 +50,7 @@ private:
     std::vector<Window> _windows;
     std::vector<RuleValue> _windowValues;
     ColumnEvaluator _columns;
+    KeptComparisons _kept;
 };
 
 } // namespace velmora

@@ -50,9 +50,9 @@ double Evaluator::number(std::uint32_t index) {
     case Operation::Not: return negation(number(node.first));
     case Operation::And:
     case Operation::Or: return connect(node);
-    case Operation::In: return isAmong(node);
+    case Operation::In:
     case Operation::Equal:
-    case Operation::Unequal:
+    case Operation::Unequal: return compared(index);
     case Operation::Less:
     case Operation::LessOrEqual:
     case Operation::Greater:
@@ -76,6 +76,12 @@ double Evaluator::number(std::uint32_t index) {
     case Operation::Minimum: return goThrough(node);
     default: return compute(node);
     }
+}
+
+double Evaluator::compared(std::uint32_t index) {
+    const ExpressionNode& node = _expression.nodes[index];
+    const auto again = [&] { return node.operation == Operation::In ? isAmong(node) : compare(node); };
+    return _kept.has(index) ? _kept.result(index, _inputs, _slots, again) : again();
 }
 
 double Evaluator::connect(const ExpressionNode& node) {

@@ -5,6 +5,7 @@
 
 #include "Analysis/Rules/Evaluation/ColumnEvaluator.h"
 #include "Analysis/Rules/Evaluation/InputStore.h"
+#include "Analysis/Rules/Evaluation/KeptComparisons.h"
 #include "Analysis/Rules/Evaluation/RuleValue.h"
 #include "Analysis/Rules/Evaluation/Wakeup.h"
 #include "Analysis/Rules/Expression/Expression.h"
@@ -19,9 +20,10 @@ namespace velmora {
 class Evaluator {
 public:
     Evaluator(const Expression& expression, std::span<const std::uint32_t> slots, const InputStore& inputs,
-              std::span<const RuleValue> windows, ColumnEvaluator& columns, Wakeup& wakeup)
+              std::span<const RuleValue> windows, ColumnEvaluator& columns, KeptComparisons& kept,
+              Wakeup& wakeup)
         : _expression(expression), _slots(slots), _inputs(inputs), _windows(windows), _columns(columns),
-          _wakeup(wakeup) {}
+          _kept(kept), _wakeup(wakeup) {}
 
     [[nodiscard]] RuleValue value() {
         return evaluate(static_cast<std::uint32_t>(_expression.nodes.size() - 1));
@@ -31,6 +33,7 @@ public:
     [[nodiscard]] double number(std::uint32_t node);
 
 private:
+    [[nodiscard]] double compared(std::uint32_t node);
     [[nodiscard]] double connect(const ExpressionNode& node);
     [[nodiscard]] double compare(const ExpressionNode& node);
     [[nodiscard]] bool mayBeText(const ExpressionNode& node) const;
@@ -54,6 +57,7 @@ private:
     const InputStore& _inputs;
     std::span<const RuleValue> _windows;
     ColumnEvaluator& _columns; ///< of the same expression
+    KeptComparisons& _kept;    ///< the same
     Wakeup& _wakeup;
     const Neighbour* _neighbour = nullptr; ///< the current one
     const InputCell* _row = nullptr;       ///< whose row is the current one

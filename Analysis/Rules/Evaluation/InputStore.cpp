@@ -25,6 +25,7 @@ void InputStore::beginTurn(MessageNumber message, Time now) {
 }
 
 void InputStore::touch(std::uint32_t slot) {
+    ++_slots[slot].changes;
     if (_slots[slot].turn == _turn)
         return;
     _slots[slot].turn = _turn;
@@ -92,8 +93,10 @@ void InputStore::setNeighbours(std::span<const Neighbour> neighbours) {
 }
 
 void InputStore::clear() {
-    for (Slot& slot : _slots)
+    for (Slot& slot : _slots) {
         slot.cells.clear();
+        ++slot.changes;
+    }
     _neighbours.clear();
     _neighbourColumns.clear();
     _touched.clear();

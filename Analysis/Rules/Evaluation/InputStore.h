@@ -47,6 +47,7 @@ public:
         RuleInput input;
         std::vector<InputCell> cells; ///< one, or one a row
         std::uint64_t turn = 0;       ///< in which it was reported or removed
+        std::uint64_t changes = 0;    ///< how often that was
     };
 
     /// The slot of an input, which is made where there is none.

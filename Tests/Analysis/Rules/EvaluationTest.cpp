@@ -50,6 +50,20 @@ TEST(EvaluationTest, FindsValuesInListsAndRanges) {
               "false");
 }
 
+TEST(EvaluationTest, ComparesATextAgainWhenAnotherIsReported) {
+    EvaluatedExpression either("radio.technology == 'NR' or radio.technology in ('GSM', 'LTE')");
+    EXPECT_EQ(either.value(), "unknown");
+    EXPECT_EQ(either.turn(1).set("radio.technology", "LTE").value(), "true");
+    EXPECT_EQ(either.turn(2).value(), "true");
+    EXPECT_EQ(either.turn(3).set("radio.technology", "UMTS").value(), "false");
+    EXPECT_EQ(either.turn(4).value(), "false");
+    EXPECT_EQ(either.turn(5).set("radio.technology", "NR").value(), "true");
+    EXPECT_EQ(either.turn(6).remove("radio.technology").value(), "unknown");
+    EXPECT_EQ(either.turn(7).value(), "unknown");
+    EXPECT_EQ(either.turn(8).set("radio.technology", "GSM").value(), "true");
+    EXPECT_EQ(either.turn(9).clear().value(), "unknown");
+}
+
 TEST(EvaluationTest, ComparesEnumerationsByTextOrNumber) {
     EvaluatedExpression byNumber("radio.state == 3");
     EXPECT_EQ(byNumber.set("radio.state", 3).value(), "true");

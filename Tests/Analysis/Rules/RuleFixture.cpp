@@ -140,6 +140,12 @@ EvaluatedExpression& EvaluatedExpression::remove(std::string_view name) {
     return *this;
 }
 
+EvaluatedExpression& EvaluatedExpression::clear() {
+    _value.reset();
+    _inputs.clear();
+    return *this;
+}
+
 EvaluatedExpression& EvaluatedExpression::neighbours(const std::vector<Neighbour>& neighbours) {
     _value.reset();
     _inputs.setNeighbours(neighbours);

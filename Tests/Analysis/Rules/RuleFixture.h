@@ -72,6 +72,8 @@ public:
     EvaluatedExpression& set(std::string_view name, std::string_view text);
     EvaluatedExpression& setRow(std::string_view path, std::uint32_t row, double number);
     EvaluatedExpression& remove(std::string_view name);
+    /// Nothing is known any more.
+    EvaluatedExpression& clear();
     EvaluatedExpression& neighbours(const std::vector<Neighbour>& neighbours);
 
     /// "true", "false", "unknown", a number or a text.
