@@ -33,6 +33,7 @@ void Base::updateSectionRef(const Value& node) {
     _views = views();
     _records.clear();
     _records.resize(_views.size());
+    ++_changes;
     logLine(LogPriority::Warning, getSectionName());
 }
 
@@ -103,10 +104,13 @@ bool Base::prepareFor(const View& view, KeptRecords::Parts parts) {
 }
 
 void Base::keepPrepared(const View& view, const Record& record, KeptRecords::Parts parts) {
-    if (_records.keep(indexOf(view), record.bytes(), parts))
+    ++_changes;
+    if (_records.keep(indexOf(view), record.bytes(), parts)) {
         writeNode();
-    if (_observer)
-        observeRecord(view, record);
+    } else if (!_isUnwritten && _unwritten) {
+        _unwritten->push_back(this);
+        _isUnwritten = true;
+    }
 }
 
 void Base::observeRecord(const View& view, const Record& record) {
@@ -119,7 +123,7 @@ void Base::writeNode() {
         writeInto(*list);
     } else if (Dictionary* const node = _dictionaryRef.get()) {
         _records.writeAll([this, node](std::size_t view, Bytes bytes) {
-            DisplayWriter writer(*node, _spareRows);
+            DisplayWriter writer(*node, _spareRows, _wanted.get());
             decode(_views[view], Record(bytes), writer);
         });
     } else {
@@ -130,7 +134,7 @@ void Base::writeNode() {
 void Base::writeInto(Array& node) {
     _records.writeAll([this, &node](std::size_t view, Bytes bytes) {
         const ArrayLock::Guard guard;
-        DisplayWriter writer(node, _spareRows);
+        DisplayWriter writer(node, _spareRows, _wanted.get());
         decode(_views[view], Record(bytes), writer);
     });
 }

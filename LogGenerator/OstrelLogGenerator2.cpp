@@ -3,6 +3,7 @@
 
 #include "LogGenerator/OstrelLogGenerator2.h"
 
+#include "LogGenerator/Display/SectionPlaces.h"
 #include "LogGenerator/MessageEffects.h"
 #include "LogGenerator/Observations/CatalogueWriter.h"
 #include "LogGenerator/Observations/Observer.h"
@@ -83,7 +84,7 @@ void OstrelLogGenerator2::updateStateReporting(Dictionary& state, const Data& da
     for (auto section = subscribers->begin(); section != subscribers->end(); ++section)
         // A section that lists a code twice is called twice and reported once.
         if (std::find(subscribers->begin(), section, *section) == section)
-            if (const Value node = (*section)->node(); !node.isNone())
+            if (const Value node = (*section)->node(); !node.isNone() && (*section)->isWanted())
                 effects.section((*section)->getSectionName(), node);
 }
 
@@ -125,8 +126,10 @@ std::optional<std::uint32_t> OstrelLogGenerator2::routeParsed(const Data& messag
 
 Value OstrelLogGenerator2::getDisplayFromState(Dictionary& state) {
     if (const Value& display = state["Display"]; !display.isNone()) {
-        if (!_sectionsAttached)
+        if (!_sectionsAttached) {
             attachSections(display, state["Template"]);
+            selectSections(*cIndex, display, _wanted);
+        }
         _sectionsAttached = true;
         cIndex->writeNodes();
         return display;
@@ -144,6 +147,7 @@ Value OstrelLogGenerator2::getDisplayFromState(Dictionary& state) {
     cIndex->status();
     const Value display = processTemplate(state["Template"]);
     printDict(display);
+    selectSections(*cIndex, display, _wanted);
     state.set("Display", display);
     state.set("ExtraInfo", makeDictionary());
     _sectionsAttached = true;
@@ -292,6 +296,16 @@ Value OstrelLogGenerator2::generateLogUsingState(Dictionary& state) {
 Value OstrelLogGenerator2::display(Dictionary& state) {
     cIndex->writeNodes();
     return state["Display"];
+}
+
+void OstrelLogGenerator2::setWantedPaths(std::span<const std::string> paths) {
+    // One section's log line of that priority has all of its node.
+    if (!isLogged(LogPriority::Warning))
+        _wanted = {false, {paths.begin(), paths.end()}};
+}
+
+std::vector<ChangingPlace> OstrelLogGenerator2::changingPlaces(const Dictionary& state) const {
+    return sectionPlaces(*cIndex, state["Display"]);
 }
 
 Value OstrelLogGenerator2::memory() const {
