@@ -70,6 +70,7 @@ MessageLines::MessageLines(Output& output, bool isLive, const NodeSelection& sel
 void MessageLines::didMakeDecoder(LogGenerator& decoder) {
     if (_selection.paths().empty())
         return;
+    _selection.limit(decoder);
     const Catalogue& catalogue = decoder.catalogue();
     Places& places = _places[catalogue.technology()];
     for (const CatalogueField& leaf : catalogue.fields()) {
