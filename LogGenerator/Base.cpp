@@ -121,10 +121,12 @@ bool Base::prepareFor(const View& view, KeptRecords::Parts parts) {
 }
 
 void Base::keepPrepared(const View& view, const Record& record, KeptRecords::Parts parts) {
-    if (_records.keep(indexOf(view), record.bytes(), parts))
+    if (_records.keep(indexOf(view), record.bytes(), parts)) {
         writeNode();
-    if (_observer)
-        observeRecord(view, record);
+    } else if (!_isUnwritten && _unwritten) {
+        _unwritten->push_back(this);
+        _isUnwritten = true;
+    }
 }
 
 void Base::observeRecord(const View& view, const Record& record) {
@@ -137,7 +139,7 @@ void Base::writeNode() {
         writeInto(*list);
     } else if (Dictionary* const node = _dictionaryRef.get()) {
         _records.writeAll([this, node](std::size_t view, Bytes bytes) {
-            DisplayWriter writer(*node, _spareRows);
+            DisplayWriter writer(*node, _spareRows, _wanted.get());
             decode(_views[view], Record(bytes), writer);
         });
     } else {
@@ -153,7 +155,7 @@ void Base::nameLatest(FieldVisitor& visitor) const {
 void Base::writeInto(Array& node) {
     _records.writeAll([this, &node](std::size_t view, Bytes bytes) {
         const ArrayLock::Guard guard;
-        DisplayWriter writer(node, _spareRows);
+        DisplayWriter writer(node, _spareRows, _wanted.get());
         decode(_views[view], Record(bytes), writer);
     });
 }

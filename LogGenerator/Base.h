@@ -3,6 +3,7 @@
 
 #pragma once
 
+#include "LogGenerator/Display/WantedLabels.h"
 #include "LogGenerator/Fields/DisplayWriter.h"
 #include "LogGenerator/Fields/FieldVisitor.h"
 #include "LogGenerator/KeptRecords.h"
@@ -74,6 +75,16 @@ public:
         _fieldMap = map;
     }
 
+    /// What is written of the node from now on; null for all, which is the default. Where nothing is, records
+    /// are checked and observed and not kept.
+    void setWanted(std::unique_ptr<const WantedLabels> wanted) { _wanted = std::move(wanted); }
+    [[nodiscard]] bool isWanted() const { return !_wanted || !_wanted->isEmpty(); }
+    /// The sections whose nodes are to be written: from now on this section joins them when it keeps a
+    /// record. The list must outlive it.
+    void setUnwritten(std::vector<Base*>* sections) { _unwritten = sections; }
+    /// The section has been taken off that list.
+    void leftUnwritten() { _isUnwritten = false; }
+
     /// What the section needs of earlier records for later ones and has in no node; none for most sections.
     [[nodiscard]] virtual Value memory() const { return {}; }
     /// Continues with what another section of the kind had in memory.
@@ -83,6 +94,11 @@ public:
     void updateSectionRef(const Value& node);
     /// The node with all that has arrived; none before the display is built and once it is gone.
     [[nodiscard]] Value node();
+    /// Whether that is the section's node.
+    [[nodiscard]] bool isNode(const Value& value) const {
+        return (value.asDictionary() && value.asDictionary() == _dictionaryRef.get()) ||
+               (value.asArray() && value.asArray() == _arrayRef.get());
+    }
     /// Writes what has arrived and is not in the node yet.
     void writeNode();
     [[nodiscard]] bool hasNode() const { return _dictionaryRef.get() || _arrayRef.get(); }
@@ -94,7 +110,7 @@ public:
     [[nodiscard]] bool showsOwnRecordsOnly() const { return _showsOwnRecordsOnly; }
     /// A number that stays while the node shows the same, and is one more after a record was kept. Any other
     /// is that of more records, or of another node.
-    [[nodiscard]] std::uint64_t changes() const { return _records.changes(); }
+    [[nodiscard]] const std::uint64_t& changes() const { return _records.changes(); }
     /// Names the fields of the record that was kept last. Precondition: there has been one.
     void nameLatest(FieldVisitor& visitor) const;
     /// Appends this section to the subscribers of each of its codes: a code listed twice is subscribed twice.
@@ -128,10 +144,13 @@ protected:
     /// keep more than bytes in the section: what it replaces has been written by then where it must be.
     template <class Store>
     void keep(const View& view, const Record& record, KeptRecords::Parts parts, Store store) {
-        if (prepareFor(view, parts)) {
-            store();
+        if (!prepareFor(view, parts))
+            return;
+        store();
+        if (isWanted())
             keepPrepared(view, record, parts);
-        }
+        if (_observer)
+            observeRecord(view, record);
     }
     void keep(const View& view, const Record& record, KeptRecords::Parts parts) {
         keep(view, record, parts, [] {});
@@ -189,6 +208,9 @@ private:
     bool _showsOwnRecordsOnly = false;
     KeptRecords _records;
     DisplayWriter::SpareRows _spareRows;
+    std::unique_ptr<const WantedLabels> _wanted; ///< null: all are
+    std::vector<Base*>* _unwritten = nullptr;
+    bool _isUnwritten = false; ///< in that list
     Observer* _observer = nullptr;
     const FieldMap* _fieldMap = nullptr;
 };

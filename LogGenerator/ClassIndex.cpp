@@ -56,8 +56,11 @@ std::vector<std::string> ClassIndex::getAllLogCodes() const {
 }
 
 void ClassIndex::writeNodes() const {
-    for (const auto& [name, section] : classDict)
+    for (Base* const section : _unwritten)
         section->writeNode();
+    for (Base* const section : _unwritten)
+        section->leftUnwritten();
+    _unwritten.clear();
 }
 
 void ClassIndex::releaseSections() {

@@ -70,6 +70,7 @@ private:
         if constexpr (std::is_base_of_v<CellSection, Section>)
             section->shareCellList(_cellList);
         section->initWithDict(classDict, codeDictionary);
+        section->setUnwritten(&_unwritten);
         _routes.clear();
         Section* const made = section.get();
         _sections.push_back(std::move(section));
@@ -84,6 +85,7 @@ private:
     void makeRoutes() const;
 
     std::vector<std::unique_ptr<Base>> _sections; ///< in the order of their creation
+    mutable std::vector<Base*> _unwritten;        ///< those that keep what is not in their nodes
     std::shared_ptr<CellList> _cellList = std::make_shared<CellList>();
     /// `codeDictionary` as a hash table, which every message needs: the slot of a code is its remainder or
     /// the next free one. Rebuilt lazily when codes have been added.

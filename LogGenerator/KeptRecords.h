@@ -64,7 +64,7 @@ public:
     void clear();
 
     /// A number that is one more after each kept record, and another, but never by one, after `clear`.
-    [[nodiscard]] std::uint64_t changes() const { return _lastOrder; }
+    [[nodiscard]] const std::uint64_t& changes() const { return _lastOrder; }
     /// The view of the record that was kept last, whether or not it has been written. Precondition: there has
     /// been one.
     [[nodiscard]] std::size_t latest() const { return _latest; }

@@ -3,13 +3,17 @@
 
 #pragma once
 
+#include "LogGenerator/Display/ChangingPlace.h"
 #include "Platform/Clock.h"
 #include "PropertyLists/Value.h"
 
 #include <cstdint>
 #include <memory>
 #include <optional>
+#include <span>
+#include <string>
 #include <string_view>
+#include <vector>
 
 namespace velmora {
 
@@ -44,6 +48,16 @@ public:
     /// records until the display is requested, so that "Display" in the state may lack the latest ones: read
     /// it through this function only.
     [[nodiscard]] virtual Value display(Dictionary& state);
+    /// Of the displays only what these paths lead to (see PathPattern) is needed from now on: the rest may
+    /// show less than has arrived, which saves writing it. Errors of all messages are logged as before. To be
+    /// called before the first message. The default writes everything.
+    virtual void setWantedPaths(std::span<const std::string> /*paths*/) {}
+    /// All places of the state's display that messages change. Empty where they are not known: then each
+    /// message may change everything. The counts are those of records that have arrived,
+    /// which `display` writes.
+    [[nodiscard]] virtual std::vector<ChangingPlace> changingPlaces(const Dictionary& /*state*/) const {
+        return {};
+    }
     /// What the decoder needs for later messages and has not in the state; none for most. With a state after
     /// `display` and this, another decoder continues as this one would.
     [[nodiscard]] virtual Value memory() const { return {}; }

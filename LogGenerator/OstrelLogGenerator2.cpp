@@ -3,6 +3,7 @@
 
 #include "LogGenerator/OstrelLogGenerator2.h"
 
+#include "LogGenerator/Display/SectionPlaces.h"
 #include "LogGenerator/MessageEffects.h"
 #include "LogGenerator/Observations/CatalogueWriter.h"
 #include "LogGenerator/Observations/Observer.h"
@@ -82,7 +83,7 @@ void OstrelLogGenerator2::updateStateReporting(Dictionary& state, const Data& da
         return;
     for (auto section = subscribers->begin(); section != subscribers->end(); ++section)
         // A section that lists a code twice is called twice and reported once.
-        if (std::find(subscribers->begin(), section, *section) == section)
+        if ((*section)->isWanted() && std::find(subscribers->begin(), section, *section) == section)
             effects.concerned(**section);
 }
 
@@ -124,8 +125,10 @@ std::optional<std::uint32_t> OstrelLogGenerator2::routeParsed(const Data& messag
 
 Value OstrelLogGenerator2::getDisplayFromState(Dictionary& state) {
     if (const Value& display = state["Display"]; !display.isNone()) {
-        if (!_sectionsAttached)
+        if (!_sectionsAttached) {
             attachSections(display, state["Template"]);
+            selectSections(*cIndex, display, _wanted);
+        }
         _sectionsAttached = true;
         cIndex->writeNodes();
         return display;
@@ -143,6 +146,7 @@ Value OstrelLogGenerator2::getDisplayFromState(Dictionary& state) {
     cIndex->status();
     const Value display = processTemplate(state["Template"]);
     printDict(display);
+    selectSections(*cIndex, display, _wanted);
     state.set("Display", display);
     state.set("ExtraInfo", makeDictionary());
     _sectionsAttached = true;
@@ -291,6 +295,16 @@ Value OstrelLogGenerator2::generateLogUsingState(Dictionary& state) {
 Value OstrelLogGenerator2::display(Dictionary& state) {
     cIndex->writeNodes();
     return state["Display"];
+}
+
+void OstrelLogGenerator2::setWantedPaths(std::span<const std::string> paths) {
+    // One section's log line of that priority has all of its node.
+    if (!isLogged(LogPriority::Warning))
+        _wanted = {false, {paths.begin(), paths.end()}};
+}
+
+std::vector<ChangingPlace> OstrelLogGenerator2::changingPlaces(const Dictionary& state) const {
+    return sectionPlaces(*cIndex, state["Display"]);
 }
 
 Value OstrelLogGenerator2::memory() const {

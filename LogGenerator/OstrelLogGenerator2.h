@@ -4,6 +4,7 @@
 #pragma once
 
 #include "LogGenerator/ClassIndex.h"
+#include "LogGenerator/Display/PathRests.h"
 #include "LogGenerator/Observations/Catalogue.h"
 #include "LogGenerator/Observations/FieldMap.h"
 #include "LogGenerator/OstrelLogGenerator.h"
@@ -35,6 +36,8 @@ public:
     void updateStateReporting(Dictionary& state, const Data& data, MessageEffects& effects) override;
     [[nodiscard]] Value generateLogUsingState(Dictionary& state) override;
     [[nodiscard]] Value display(Dictionary& state) override;
+    void setWantedPaths(std::span<const std::string> paths) override;
+    [[nodiscard]] std::vector<ChangingPlace> changingPlaces(const Dictionary& state) const override;
     /// That of the sections, by name.
     [[nodiscard]] Value memory() const override;
     void setMemory(const Value& memory) override;
@@ -83,6 +86,7 @@ private:
     std::string pListName;
     std::shared_ptr<ClassIndex> cIndex;
     bool _sectionsAttached = false;
+    PathRests _wanted{true, {}};                ///< of the root
     std::map<const Base*, FieldMap> _fieldMaps; ///< of the sections that the template has
 };
 

@@ -4,6 +4,7 @@
 #include "LogGenerator/C2K/C2KLogGenerator.h"
 
 #include "LogGenerator/C2K/LogCodeParsers.h"
+#include "LogGenerator/C2K/Targets.h"
 #include "LogGenerator/C2K/ValueVisitor.h"
 #include "LogGenerator/MessageEffects.h"
 #include "LogGenerator/Observations/CatalogueWriter.h"
@@ -124,8 +125,10 @@ void C2KLogGenerator::updateStateReporting(Dictionary& state, const Data& data, 
 
 void C2KLogGenerator::update(Dictionary& state, const Data& data, MessageEffects* effects) {
     // Builds the display on the first message.
-    if (!state.contains("Display"))
+    if (!state.contains("Display")) {
         static_cast<void>(getDisplayFromState(state));
+        limit(state);
+    }
     updateFromLog(data, state["Lookup"].dictionaryRef(), state, effects);
 }
 
@@ -189,6 +192,23 @@ Value C2KLogGenerator::generateLogUsingState(Dictionary& state) {
 Value C2KLogGenerator::display(Dictionary& state) {
     _readings.write();
     return state["Display"];
+}
+
+void C2KLogGenerator::limit(const Dictionary& state) {
+    Dictionary* const lookup = state["Lookup"].asDictionary();
+    if (!lookup || _wanted.isWhole)
+        return;
+    C2K::dropUnselected(*lookup, state["Display"], _wanted);
+    for (const C2K::LogCodeParser* const parser : C2K::logCodeParsers())
+        _readings.setKept(*parser, C2K::hasTargets(*parser, *lookup));
+}
+
+std::vector<ChangingPlace> C2KLogGenerator::changingPlaces(const Dictionary& state) const {
+    std::vector<ChangingPlace> places;
+    if (const Dictionary* const lookup = state["Lookup"].asDictionary())
+        for (std::size_t i = 0; i < C2K::logCodeParsers().size(); ++i)
+            C2K::addTargets(*C2K::logCodeParsers()[i], *lookup, _readings.changes(i), places);
+    return places;
 }
 
 void C2KLogGenerator::describe(Catalogue& catalogue) {

@@ -4,6 +4,7 @@
 #pragma once
 
 #include "LogGenerator/C2K/KeptReadings.h"
+#include "LogGenerator/Display/PathRests.h"
 #include "LogGenerator/Observations/FieldMap.h"
 #include "LogGenerator/OstrelLogGenerator.h"
 #include "LogMessages/LogMessage.h"
@@ -37,6 +38,10 @@ public:
     void updateStateReporting(Dictionary& state, const Data& data, MessageEffects& effects) override;
     [[nodiscard]] Value generateLogUsingState(Dictionary& state) override;
     [[nodiscard]] Value display(Dictionary& state) override;
+    void setWantedPaths(std::span<const std::string> paths) override {
+        _wanted = {false, {paths.begin(), paths.end()}};
+    }
+    [[nodiscard]] std::vector<ChangingPlace> changingPlaces(const Dictionary& state) const override;
 
     /// Decodes one message and keeps its record, less prefix, for the log where its code is one of the eight,
     /// whether or not the parser accepted it. `lookup`: null where the display could not be built; then the
@@ -63,6 +68,10 @@ private:
     void decode(const Data& data, const std::optional<LogMessage>& message, const DictionaryRef& lookup,
                 Dictionary& state, MessageEffects* effects);
 
+    /// Nothing is written that is not wanted of the new display.
+    void limit(const Dictionary& state);
+
+    PathRests _wanted{true, {}}; ///< of the root
     C2K::KeptReadings _readings;
     FieldMap _fieldMap; ///< of the value keys, since there is a catalogue
 };

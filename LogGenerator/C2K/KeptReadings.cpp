@@ -3,14 +3,14 @@
 
 #include "LogGenerator/C2K/KeptReadings.h"
 
-#include "LogGenerator/C2K/LogCodeParsers.h"
 #include "LogGenerator/C2K/LookupWriter.h"
 
 namespace velmora::C2K {
 
 KeptReadings::KeptReadings()
     : _records(logCodeParsers().size() * Reading::mostParts),
-      _numbers(logCodeParsers().size() * Reading::mostParts) {}
+      _numbers(logCodeParsers().size() * Reading::mostParts), _isKept(logCodeParsers().size(), true),
+      _changes(logCodeParsers().size()) {}
 
 void KeptReadings::use(const DictionaryRef& lookup) {
     // A new lookup may have the address of one that was destroyed, so that the address alone does not
@@ -24,9 +24,11 @@ void KeptReadings::use(const DictionaryRef& lookup) {
 }
 
 void KeptReadings::keep(const LogCodeParser& parser, const Reading& reading) {
-    if (_lookup.expired())
+    const std::size_t index = indexOf(parser);
+    if (_lookup.expired() || !_isKept[index])
         return;
-    const std::size_t first = indexOf(parser) * Reading::mostParts;
+    ++_changes[index];
+    const std::size_t first = index * Reading::mostParts;
     bool isNew = false;
     for (std::size_t part = 0; part < Reading::mostParts; ++part) {
         if ((reading.parts >> part & 1) == 0)

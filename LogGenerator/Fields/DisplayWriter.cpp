@@ -52,23 +52,36 @@ void DisplayWriter::put(std::string_view label, std::string_view text) {
 }
 
 void DisplayWriter::fields(const Record& record, const Layout& layout) {
-    for (const Field& field : layout.fields)
-        number(field, field.place.read(record));
+    const auto write = [&](const Field& field) {
+        put(field.label, FormattedText(field.format, field.place.read(record)).view());
+    };
+    if (isChosen()) {
+        for (const std::uint16_t index : _wanted->of(layout))
+            write(layout.fields[index]);
+    } else if (level().dictionary || level().list) {
+        for (const Field& field : layout.fields)
+            write(field);
+    }
 }
 
 void DisplayWriter::number(const Field& field, std::int64_t raw) {
-    put(field.label, FormattedText(field.format, raw).view());
+    if (!ignores(field.label))
+        put(field.label, FormattedText(field.format, raw).view());
 }
 
 void DisplayWriter::real(const Field& field, double value) {
-    put(field.label, NumberText(field.format.format, value).text());
+    if (!ignores(field.label))
+        put(field.label, NumberText(field.format.format, value).text());
 }
 
 void DisplayWriter::text(const Field& field, std::string_view text) {
-    put(field.label, text);
+    if (!ignores(field.label))
+        put(field.label, text);
 }
 
 void DisplayWriter::supplied(const Field& field, const Value& value) {
+    if (ignores(field.label))
+        return;
     Level& to = level();
     if (const std::string* string = value.asString())
         put(field.label, *string);
@@ -102,6 +115,8 @@ void DisplayWriter::beginList(const List& list) {
     Array* target = nullptr;
     if (list.label.empty()) {
         target = _depth == 0 ? _ownList : nullptr;
+    } else if (ignores(list.label)) {
+        target = nullptr;
     } else if (to.isRow) {
         target = &listIn(to.dictionary->slotAt(to.next++, list.label));
     } else if (to.dictionary) {

@@ -3,6 +3,7 @@
 
 #pragma once
 
+#include "LogGenerator/Display/WantedLabels.h"
 #include "LogGenerator/Fields/FieldVisitor.h"
 #include "PropertyLists/Value.h"
 
@@ -23,8 +24,14 @@ public:
     /// The rows that shorter lists do not use, kept for later ones.
     using SpareRows = std::vector<Value>;
 
-    DisplayWriter(Dictionary& node, SpareRows& spare) : _spare(spare) { _levels[0].dictionary = &node; }
-    DisplayWriter(Array& node, SpareRows& spare) : _ownList(&node), _spare(spare) {}
+    /// `wanted`: the labels of the dictionary or of the list's rows that are written, others are ignored;
+    /// null for all. It must outlive the writer.
+    DisplayWriter(Dictionary& node, SpareRows& spare, const WantedLabels* wanted = nullptr)
+        : _spare(spare), _wanted(wanted) {
+        _levels[0].dictionary = &node;
+    }
+    DisplayWriter(Array& node, SpareRows& spare, const WantedLabels* wanted = nullptr)
+        : _ownList(&node), _spare(spare), _wanted(wanted), _wantedDepth(rowsOfOwnList) {}
 
     void fields(const Record& record, const Layout& layout) override;
     void number(const Field& field, std::int64_t raw) override;
@@ -52,10 +59,18 @@ private:
     };
     /// The section's node, a list, a row, a list in it, and a row there.
     static constexpr std::size_t deepest = 5;
+    static constexpr std::size_t rowsOfOwnList = 2;
 
     [[nodiscard]] Level& level() { return _levels[_depth]; }
     void push(const Level& level);
     void put(std::string_view label, std::string_view text);
+    /// Whether labels here are written as far as they are wanted, not all of them.
+    [[nodiscard]] bool isChosen() const { return _wanted && _depth == _wantedDepth; }
+    /// Whether what is named under the label is written nowhere.
+    [[nodiscard]] bool ignores(std::string_view label) const {
+        const Level& to = _levels[_depth];
+        return (!to.dictionary && !to.list) || (isChosen() && !_wanted->has(label));
+    }
 
     /// The dictionary in a list's slot, to be filled again; another where there is none or something else
     /// refers to it too.
@@ -63,6 +78,8 @@ private:
 
     Array* _ownList = nullptr;
     SpareRows& _spare;
+    const WantedLabels* _wanted;
+    std::size_t _wantedDepth = 0; ///< of the level that has these labels
     std::array<Level, deepest> _levels;
     std::size_t _depth = 0;
 };

@@ -13,6 +13,7 @@ from .inputs import RECORDINGS, TECHNOLOGIES, Input
 from .running import Case, environment
 
 COLUMNS = 24
+MANY_COLUMNS = 100
 PRODUCTS = ("out.pcapng", "out.velmora", "out.dlf")
 SORTED = "_sorted"
 
@@ -40,8 +41,39 @@ def columns(display: str) -> list[str]:
     return spread + groups[:1] + groups[-1:] + missing[:1]
 
 
+def further_columns(display: str) -> Iterator[list[str]]:
+    """Selections of other kinds: many values; lists and any of their rows; all groups; the whole display beside a
+    value; and one value, so that most of the display is not selected."""
+    found = list(leaves(json.loads(display)["display"]))
+    rows = [path for path in found if re.search(r"/\d+(/|$)", path)]
+    lists = {re.sub(r"/\d+(/.*|$)", "", path) for path in rows} - {""}
+    anywhere = {re.sub(r"/\d+(?=/|$)", "/*", path) for path in rows}
+    yield found[:: max(1, len(found) // MANY_COLUMNS)][:MANY_COLUMNS]
+    yield sorted(lists | anywhere)[:MANY_COLUMNS] or ["/*"]
+    yield sorted({path.rpartition("/")[0] for path in found} - {""})[:COLUMNS] or ["/*"]
+    yield ["/", found[-1]]
+    yield [found[len(found) // 2]]
+    yield ["/*/" + found[0].rpartition("/")[2], *found[-2:]]
+
+
 def selected(paths: list[str]) -> tuple[str, ...]:
     return tuple(word for path in paths for word in ("--select", path))
+
+
+def cases_of_columns(given: Input, selections: list[list[str]]) -> Iterator[Case]:
+    """Rows by each of these selections, and what else is selected by the first two and the last one."""
+    file = str(given.path)
+    rows = ("decode", "--format", "csv")
+    for paths in selections:
+        yield Case((*rows, "--every", "message", *selected(paths), file))
+    for paths in (*selections[:2], selections[-1]):
+        chosen = (*selected(paths), file)
+        yield Case((*rows, "--safe", "--max-age", "5", *chosen))
+        yield Case(("decode", "--format", "jsonl", "--every", "message", *chosen))
+        yield Case(("decode", "--samples", "--wide", "--format", "csv", *chosen))
+    yield Case(("--log-level", "7", *rows, "--every", "message", *selected(selections[-1]), file))
+    yield Case(("decode", "--format", "json", *selected(selections[1]), file))
+    yield Case(("decode", "--samples", "--format", "csv", *selected(selections[1]), file))
 
 
 def cases(given: Input, paths: list[str]) -> Iterator[Case]:

@@ -127,6 +127,13 @@ class InputsTest(unittest.TestCase):
         shown = {"A": {"B": "1", "C": [{"D": "2"}]}, "S": {"_sorted": "_sorted", "0;7": "3"}}
         self.assertEqual(cases.columns(json.dumps({"display": shown})),
                          ["/A/B", "/A/C/0/D", "/S/7", "/A", "/S", "/A/C/4095/D"])
+        self.assertEqual(list(cases.further_columns(json.dumps({"display": shown}))),
+                         [["/A/B", "/A/C/0/D", "/S/7"],
+                          ["/A/C", "/A/C/*/D", "/S", "/S/*"],
+                          ["/A", "/A/C/0", "/S"],
+                          ["/", "/S/7"],
+                          ["/A/C/0/D"],
+                          ["/*/B", "/A/C/0/D", "/S/7"]])
 
 
 if __name__ == "__main__":

@@ -4,12 +4,11 @@
 #include "Tools/Decode/CSVRows.h"
 
 #include "Tools/Text/CSVText.h"
-#include "Tools/Text/JSONText.h"
 
 namespace velmora {
 
 CSVRows::CSVRows(Output& output, bool isLive, const DecodeOptions& options, const std::string& file)
-    : LineWriter(output, isLive), _options(options), _ages(options.maximumAge) {
+    : LineWriter(output, isLive), _options(options), _ages(options.maximumAge), _cells(options.guard) {
     if (file.empty())
         return;
     TextBuffer cell;
@@ -18,19 +17,32 @@ CSVRows::CSVRows(Output& output, bool isLive, const DecodeOptions& options, cons
     _fileCell = cell.view();
 }
 
+void CSVRows::didMakeDecoder(LogGenerator& decoder) {
+    _ages.watch(decoder);
+    _options.selection.limit(decoder);
+    if (_options.every == DecodeOptions::Every::Message)
+        _keptRows.try_emplace(&decoder, _options.selection, _options.guard, decoder);
+}
+
 void CSVRows::willConcern(const Decoded& decoded) {
     if (_options.hasTechnologyColumn)
         _technologyCell = "," + decoded.technology;
 }
 
 void CSVRows::didDecode(const LoggedMessage& message, LogGenerator& decoder, Dictionary& state) {
-    if (_options.every == DecodeOptions::Every::Message)
-        writeRow(message.time, decoder.display(state));
+    if (_options.every != DecodeOptions::Every::Message)
+        return;
+    beginRow(message.time);
+    line().append(_keptRows.at(&decoder).cells(state));
+    endLine(csvRowEnd);
 }
 
 void CSVRows::didRefresh(Time tick, const Decoded& decoded) {
-    if (_options.every == DecodeOptions::Every::Refresh)
-        writeRow(tick, _ages.fresh(decoded, tick));
+    if (_options.every == DecodeOptions::Every::Refresh) {
+        beginRow(tick);
+        _cells.appendAll(line(), _ages.fresh(decoded, tick), _options.selection);
+        endLine(csvRowEnd);
+    }
     LineWriter::didRefresh(tick, decoded);
 }
 
@@ -47,34 +59,10 @@ std::string CSVRows::header(const DecodeOptions& options) {
     return std::string(row.view());
 }
 
-void CSVRows::writeRow(Time moment, const Value& display) {
+void CSVRows::beginRow(Time moment) {
     appendTime(moment);
     line().append(_fileCell);
     line().append(_technologyCell);
-    for (const std::string& path : _options.selection.paths()) {
-        line().append(',');
-        if (NodeSelection::hasWildcard(path))
-            appendAll(display, path);
-        else
-            appendCsvCell(line(), NodeSelection::find(display, path), _options.guard);
-    }
-    endLine(csvRowEnd);
-}
-
-void CSVRows::appendAll(const Value& display, const std::string& path) {
-    _found.clear();
-    NodeSelection::findAll(display, path, _found);
-    _cell.clear();
-    for (const Value* const value : _found) {
-        if (_cell.size() > 0)
-            _cell.append("; ");
-        if (const std::string* const text = value->asString())
-            _cell.append(*text);
-        else
-            appendJson(_cell, *value);
-    }
-    if (!_found.empty())
-        appendCsvText(line(), _cell.view(), _options.guard);
 }
 
 } // namespace velmora

@@ -4,10 +4,13 @@
 #pragma once
 
 #include "Tools/Decode/FreshValues.h"
+#include "Tools/Decode/Rows/CellWriter.h"
+#include "Tools/Decode/Rows/KeptRow.h"
 #include "Tools/Text/LineWriter.h"
 
+#include <map>
 #include <string>
-#include <vector>
+#include <string_view>
 
 namespace velmora {
 
@@ -19,7 +22,7 @@ public:
     [[nodiscard]] bool wantsEveryRefresh() const override {
         return _options.every == DecodeOptions::Every::Refresh;
     }
-    void didMakeDecoder(LogGenerator& decoder) override { _ages.watch(decoder); }
+    void didMakeDecoder(LogGenerator& decoder) override;
     void willConcern(const Decoded& decoded) override;
     void didDecode(const LoggedMessage& message, LogGenerator& decoder, Dictionary& state) override;
     void didRefresh(Time tick, const Decoded& decoded) override;
@@ -29,16 +32,14 @@ public:
     [[nodiscard]] static std::string header(const DecodeOptions& options);
 
 private:
-    void writeRow(Time moment, const Value& display);
-    /// The cell of a path with "*": all its values, with "; " between them.
-    void appendAll(const Value& display, const std::string& path);
+    void beginRow(Time moment);
 
     const DecodeOptions& _options;
     std::string _fileCell;
     std::string _technologyCell;
     AgeLimit _ages;
-    std::vector<const Value*> _found;
-    TextBuffer _cell;
+    CellWriter _cells;
+    std::map<const LogGenerator*, KeptRow> _keptRows; ///< of rows by message
 };
 
 } // namespace velmora

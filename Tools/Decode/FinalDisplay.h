@@ -17,6 +17,7 @@ public:
     /// `isFirst`: nothing precedes the first heading.
     FinalDisplay(Output& output, const DecodeOptions& options, std::string title, bool isFirst)
         : DecodeWriter(output), _options(options), _title(std::move(title)), _isFirst(isFirst) {}
+    void didMakeDecoder(LogGenerator& decoder) override { _options.selection.limit(decoder); }
     [[nodiscard]] bool wantsEveryRefresh() const override { return false; }
     void finish(const Decoded& decoded) override;
 

@@ -72,6 +72,7 @@ void MessageLines::didMakeDecoder(LogGenerator& decoder) {
     _sections.clear();
     if (_selection.paths().empty())
         return;
+    _selection.limit(decoder);
     const Catalogue& catalogue = decoder.catalogue();
     Places& places = _places[catalogue.technology()];
     for (const CatalogueField& leaf : catalogue.fields()) {

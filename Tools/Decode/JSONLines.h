@@ -21,7 +21,10 @@ namespace velmora {
 class RefreshLines final : public LineWriter {
 public:
     RefreshLines(Output& output, bool isLive, const DecodeOptions& options, const std::string& file);
-    void didMakeDecoder(LogGenerator& decoder) override { _ages.watch(decoder); }
+    void didMakeDecoder(LogGenerator& decoder) override {
+        _ages.watch(decoder);
+        _selection.limit(decoder);
+    }
     void didRefresh(Time tick, const Decoded& decoded) override;
 
 private:

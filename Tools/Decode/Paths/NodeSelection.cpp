@@ -3,6 +3,7 @@
 
 #include "Tools/Decode/Paths/NodeSelection.h"
 
+#include "LogGenerator/LogGenerator.h"
 #include "LogGenerator/Observations/PathPattern.h"
 #include "Model/NodePath.h"
 
@@ -171,6 +172,20 @@ NodeSelection::NodeSelection(const std::vector<std::string>& texts) {
 bool NodeSelection::isPath(std::string_view text) {
     const std::size_t path = text.find("=/");
     return text.starts_with('/') || (path != std::string_view::npos && path != 0);
+}
+
+void NodeSelection::limit(LogGenerator& decoder) const {
+    if (!selectsAll())
+        decoder.setWantedPaths(_paths);
+}
+
+const Value* NodeSelection::findBelow(const Value& place, std::string_view rest) {
+    return findAfter(place, rest, false);
+}
+
+void NodeSelection::findAllBelow(const Value& place, std::string_view rest,
+                                 std::vector<const Value*>& found) {
+    findAllAfter(place, rest, false, found);
 }
 
 void NodeSelection::findAll(const Value& display, std::string_view path, std::vector<const Value*>& found) {

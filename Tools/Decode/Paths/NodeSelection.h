@@ -14,6 +14,8 @@
 
 namespace velmora {
 
+class LogGenerator;
+
 /// The parts of a display that a user has selected by the paths of the display tree ("/Serving Cell/ARFCN",
 /// "/Neighboring Cells/0", "/Neighboring Cells/*/ARFCN"; see PathPattern). Works on the display dictionary
 /// itself, since building the tree would cost more than all else. Where several rows share a path, `find`
@@ -27,6 +29,9 @@ public:
     /// Whether the text may be a path, which begins with a slash, or a name, "=" and a path.
     [[nodiscard]] static bool isPath(std::string_view text);
 
+    /// Has the decoder write only what is selected into its displays. To be called before its first message.
+    void limit(LogGenerator& decoder) const;
+
     [[nodiscard]] const std::vector<std::string>& paths() const { return _paths; }
     /// What a column of each path is called: its name, or the path itself.
     [[nodiscard]] const std::vector<std::string>& names() const { return _names; }
@@ -38,6 +43,9 @@ public:
     [[nodiscard]] static const Value* find(const Value& display, std::string_view path);
     /// The values of all nodes at a path with "*", in the display's order.
     static void findAll(const Value& display, std::string_view path, std::vector<const Value*>& found);
+    /// The same from a place of the display on, by what is left of a path there, which is not empty.
+    [[nodiscard]] static const Value* findBelow(const Value& place, std::string_view rest);
+    static void findAllBelow(const Value& place, std::string_view rest, std::vector<const Value*>& found);
     /// Whether the path may be that of several nodes.
     [[nodiscard]] static bool hasWildcard(std::string_view path);
 

@@ -12,6 +12,7 @@ SampleWriter::SampleWriter(Output& output, bool isLive, const DecodeOptions& opt
 
 void SampleWriter::didMakeDecoder(LogGenerator& decoder) {
     decoder.setObservationSink(this);
+    decoder.setWantedPaths({}); // no display is shown
 }
 
 void SampleWriter::willConcern(const Decoded& decoded) {
