@@ -99,8 +99,11 @@ std::vector<std::string> technologiesOf(const std::string& path) {
     const Result<std::unique_ptr<MessageReader>> reader = openMessages(path);
     if (!reader)
         return {};
-    (*reader)->setReadsAllTechnologies(true);
-    while ((*reader)->next()) {
+    // A DLF log has one technology, which opening it has derived; any other file may name one at its end.
+    if (!dynamic_cast<const DLFReader*>(reader->get())) {
+        (*reader)->setReadsAllTechnologies(true);
+        while ((*reader)->next()) {
+        }
     }
     std::vector<std::string> names = (*reader)->technologies();
     std::erase(names, std::string());

@@ -5,6 +5,7 @@
 
 #include <QObject>
 
+#include <cstddef>
 #include <cstdint>
 #include <vector>
 

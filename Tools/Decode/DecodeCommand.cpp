@@ -24,6 +24,7 @@
 #include "Tools/Report.h"
 
 #include <algorithm>
+#include <cstdint>
 #include <functional>
 #include <memory>
 #include <optional>
@@ -163,10 +164,18 @@ std::size_t jobsFor(const DecodeOptions& options) {
         return 1;
     if (options.jobs)
         return std::min(*options.jobs, files);
-    // Several pipes may be written by one program, which fills the second one after the first.
-    const std::ptrdiff_t pipes = std::count_if(options.files.begin(), options.files.end(),
-                                               [](const std::string& file) { return !inputSize(file); });
-    return pipes > 1 ? 1 : std::min(usableProcessors(), files);
+    std::size_t pipes = 0;
+    std::uint64_t bytes = 0;
+    for (const std::string& file : options.files) {
+        const std::optional<std::uint64_t> size = inputSize(file);
+        pipes += size ? 0 : 1;
+        bytes += size.value_or(0);
+    }
+    // Several pipes may be written by one program, which fills the second one after the first. And a process
+    // costs two milliseconds, in which a small file is decoded.
+    constexpr std::uint64_t smallFile = std::uint64_t{8} << 20;
+    const bool areSmall = pipes == 0 && bytes < files * smallFile;
+    return pipes > 1 || areSmall ? 1 : std::min(usableProcessors(), files);
 }
 
 } // namespace

@@ -131,9 +131,9 @@ CLI::App* addDecode(CLI::App& app, DecodeOptions& options) {
                       "End at a message that ends the application; by default it is counted, reported and "
                       "left out");
     command
-        ->add_option(
-            "--jobs", options.jobs,
-            "Decode this many files in parallel, at most 1000; by default, as many as there are processors")
+        ->add_option("--jobs", options.jobs,
+                     "Decode this many files in parallel, at most 1000; by default, as many as there are "
+                     "processors, and 1 where files are small or several are pipes")
         ->check(countUpTo(maximumJobs))
         ->type_name("N");
     command->footer(
