@@ -13,9 +13,9 @@
 
 namespace velmora {
 
-/// The save screen's layout: Cancel, a heading and Save in a row (where that is too narrow,
-/// the heading in a row of its own), below them the description field, below
-/// that the list, and around all a background. Main thread only.
+/// The save screen's layout: Cancel, a heading and Save in a row (where that is too narrow, the heading in a
+/// row of its own), below them the description field, below that the list, and around all a background. Main
+/// thread only.
 class VelmoraSaveView final : public View {
 public:
     /// The list and the field are the screen's; they leave this view when they end.

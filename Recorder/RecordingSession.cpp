@@ -10,6 +10,7 @@
 #include "Recording/Files/DescriptorFile.h"
 
 #include <algorithm>
+#include <cerrno>
 #include <filesystem>
 #include <utility>
 

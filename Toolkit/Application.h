@@ -15,8 +15,8 @@ class ApplicationDelegate;
 /// The connection to the display and the event loop of a program with screens. One a process; made on the
 /// main thread before anything else of the toolkit (but Font, Color and geometry) and before anything that
 /// uses the loop - main queue, timers, ports - and destroyed after all of these. It takes the toolkit's own
-/// options (-platform, -style, ...) out of the arguments. Where the user's language is
-/// written from right to left, so is the layout.
+/// options (-platform, -style, ...) out of the arguments. Where the user's language is written from right to
+/// left, so is the layout.
 class Application {
 public:
     /// Ends the program with a message when there is no display.

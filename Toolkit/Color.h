@@ -13,7 +13,7 @@ enum class Color {
     darkText,  ///< text on the ordinary ground: dark on a light palette, light on a dark one
     secondary, ///< secondary text
     ground,    ///< the ordinary ground
-    poor,      ///< text and bars of something that is so good, always with a word beside the colour
+    poor,      ///< how good something is, in texts and bars, always with a word beside the colour
     fair,
     good,
     excellent

@@ -169,8 +169,8 @@ function(velmora_header_check)
     file(GLOB_RECURSE headers CONFIGURE_DEPENDS RELATIVE ${PROJECT_SOURCE_DIR}
          ${PROJECT_SOURCE_DIR}/Analysis/*.h ${PROJECT_SOURCE_DIR}/App/*.h ${PROJECT_SOURCE_DIR}/Export/*.h
          ${PROJECT_SOURCE_DIR}/Fuzz/*.h ${PROJECT_SOURCE_DIR}/LogGenerator/*.h ${PROJECT_SOURCE_DIR}/LogMessages/*.h
-         ${PROJECT_SOURCE_DIR}/Model/*.h ${PROJECT_SOURCE_DIR}/Platform/*.h ${PROJECT_SOURCE_DIR}/PropertyLists/*.h
-         ${PROJECT_SOURCE_DIR}/Recording/*.h ${PROJECT_SOURCE_DIR}/Telephony/*.h ${PROJECT_SOURCE_DIR}/Tests/*.h
+         ${PROJECT_SOURCE_DIR}/Model/*.h ${PROJECT_SOURCE_DIR}/Platform/*.h ${PROJECT_SOURCE_DIR}/Playback/*.h
+         ${PROJECT_SOURCE_DIR}/PropertyLists/*.h ${PROJECT_SOURCE_DIR}/Recorder/*.h ${PROJECT_SOURCE_DIR}/Recording/*.h ${PROJECT_SOURCE_DIR}/Telephony/*.h ${PROJECT_SOURCE_DIR}/Tests/*.h
          ${PROJECT_SOURCE_DIR}/Toolkit/*.h ${PROJECT_SOURCE_DIR}/Tools/*.h)
     set(sources)
     foreach(header IN LISTS headers)

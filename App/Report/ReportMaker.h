@@ -27,7 +27,7 @@ class ReportMaker {
 public:
     struct Options {
         std::string path; ///< the recording's, which may still grow: what is in it then is on the page
-        bool hasIdentities = false;
+        bool hasIdentities = false;     ///< as of DriveReport, on an unmasked page
         PlayedDecoder::Masking masking; ///< null where messages are shown as they are
         std::vector<RuleFile> rules;
     };

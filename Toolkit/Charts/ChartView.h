@@ -20,11 +20,10 @@ class ChartWidget;
 ///
 /// The range follows "now" - the time that `setNow` gave - until the user moves it; N, End or `followNow`
 /// returns to that. Dragging, the wheel with Shift or sideways, Page Up and Page Down pan; the wheel, a
-/// pinch,
-/// + and - (around the cursor) zoom; a tap or click and Left and Right (with Shift ten samples at once) set
-/// the cursor; Home goes to the oldest sample; Escape removes the cursor; T changes to the table and back. 1,
-/// 5, 3 and A choose one minute, five, thirty or all. A stroke of a finger up or down scrolls what the chart
-/// lies in.
+/// pinch, + and - (around the cursor) zoom; a tap or click and Left and Right (with Shift ten samples at
+/// once) set the cursor; Home goes to the oldest sample; Escape removes the cursor; T changes to the table
+/// and back. 1, 5, 3 and A choose one minute, five, thirty or all. A stroke of a finger up or down scrolls
+/// what the chart lies in.
 ///
 /// Nothing is drawn while the view is hidden, and after `samplesChanged` and `setNow` only when something in
 /// the range is different.

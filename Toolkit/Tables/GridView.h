@@ -50,9 +50,9 @@ public:
     [[nodiscard]] const std::vector<GridRow>& rows() const;
     /// What an empty grid says.
     void setPlaceholder(std::string_view text);
-    /// Rows as high as a finger needs, for those that can be chosen.
+    /// Called with the row that the user chooses. Rows are as high as a finger needs from then on.
     void setOnChoose(std::function<void(std::size_t row)> choose);
-    /// With the head.
+    /// In points, of so many rows and the head.
     [[nodiscard]] double heightOfRows(std::size_t rows) const;
 
 private:

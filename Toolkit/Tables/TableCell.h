@@ -15,13 +15,13 @@ namespace velmora {
 class CellWidget;
 
 enum class TableCellStyle {
-    plain = 0, ///< one text, on the left
-    value = 1  ///< a left and a right text
+    plain = 0, ///< one text, where lines begin
+    value = 1  ///< a leading and a trailing text
 };
 
 /// One row of a table on the screen. The data source makes cells and the table keeps them for reuse when
 /// their row leaves the screen. A row's content goes into the content view, which is the cell without the
-/// accessory at its right edge.
+/// accessory at its trailing edge.
 ///
 /// A row's name for screen readers is its accessible name or, without one, the texts of the labels in its
 /// content view, in the order in which they were added, with ", " between ("RSSI, -80 dBm").
