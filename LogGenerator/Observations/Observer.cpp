@@ -22,7 +22,7 @@ void Observer::beginMessage() {
     _removed.clear();
     _levels.clear();
     _texts.clear();
-    _usedRowNumbers = _usedDeepRows = 0;
+    _rows.clear();
     _row = {};
 }
 
@@ -190,10 +190,9 @@ void Observer::tree(Catalogue& catalogue, Catalogue::Node& node, std::string_vie
                 tree(catalogue, *place, section, child);
     } else if (const Array* const array = value.asArray()) {
         _lists.push_back({&node, static_cast<std::uint32_t>(array->size())});
-        const RowNumbers outer = _row;
+        const ObservedRows::Numbers outer = _row;
         for (std::size_t i = 0; i < array->size(); ++i) {
-            _row = outer;
-            newRow(static_cast<std::uint32_t>(i));
+            _row = _rows.add(outer, static_cast<std::uint32_t>(i));
             const std::size_t first = _observations.size();
             tree(catalogue, node.rows(), section, (*array)[i]);
             setKey(first, node.rows().keys());
@@ -244,23 +243,6 @@ void Observer::setShown(const CatalogueField& leaf, bool isShown) {
     _shown[leaf.index] = isShown;
 }
 
-void Observer::newRow(std::uint32_t number) {
-    if (_row.empty()) {
-        if (_usedRowNumbers == _rowNumbers.size())
-            _rowNumbers.emplace_back();
-        std::uint32_t& only = _rowNumbers[_usedRowNumbers++];
-        only = number;
-        _row = {&only, 1};
-        return;
-    }
-    if (_usedDeepRows == _deepRows.size())
-        _deepRows.emplace_back();
-    std::vector<std::uint32_t>& row = _deepRows[_usedDeepRows++];
-    row.assign(_row.begin(), _row.end());
-    row.push_back(number);
-    _row = row;
-}
-
 void Observer::beginList(const List& list) {
     _levels.push_back({&list, _row});
 }
@@ -269,14 +251,12 @@ void Observer::beginValue() {
     if (_levels.empty() || _levels.back().list->entries != List::Entries::Values)
         return;
     Level& level = _levels.back();
-    _row = level.outerRow;
-    newRow(level.next++);
+    _row = _rows.add(level.outerRow, level.next++);
 }
 
 void Observer::beginRow() {
     Level& level = _levels.back();
-    _row = level.outerRow;
-    newRow(level.next++);
+    _row = _rows.add(level.outerRow, level.next++);
     level.firstOfRow = _observations.size();
 }
 
@@ -289,24 +269,12 @@ void Observer::endRow() {
 void Observer::setKey(std::size_t first, std::span<const std::string_view> names) {
     if (names.empty() || first == _observations.size() || !_wanted.hasRowKeys())
         return;
-    const std::span<Observation> row(&_observations[first], _observations.size() - first);
-    const std::size_t depth = row.front().rows.size();
-    std::string& key = _texts.add();
-    for (const std::string_view name : names)
-        for (const Observation& each : row)
-            if (each.rows.size() == depth && each.leaf->node->name() == name) {
-                key += key.empty() ? "" : "/";
-                key += _keyText.of(each);
-                break;
-            }
-    for (Observation& each : row)
-        each.rowKey = key;
+    _keys.set(std::span(_observations).subspan(first), names, _texts);
 }
 
 void Observer::entryNumber(std::size_t, std::uint16_t number) {
     Level& level = _levels.back();
-    _row = level.outerRow;
-    newRow(number);
+    _row = _rows.add(level.outerRow, number);
     ++level.next;
     if (_wanted.hasRowKeys())
         level.numberKey = _texts.add() = std::to_string(number);

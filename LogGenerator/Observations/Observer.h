@@ -6,12 +6,13 @@
 #include "LogGenerator/Fields/FieldVisitor.h"
 #include "LogGenerator/Observations/FieldMap.h"
 #include "LogGenerator/Observations/Observation.h"
+#include "LogGenerator/Observations/ObservedRows.h"
+#include "LogGenerator/Observations/RowKeys.h"
 #include "LogGenerator/Observations/TextArena.h"
 #include "LogGenerator/Observations/WantedLeaves.h"
 
 #include <cstddef>
 #include <cstdint>
-#include <deque>
 #include <optional>
 #include <span>
 #include <string_view>
@@ -69,10 +70,9 @@ public:
     void endList() override;
 
 private:
-    using RowNumbers = std::span<const std::uint32_t>;
     struct Level {
         const List* list;
-        RowNumbers outerRow;             ///< that the list is in; empty for none
+        ObservedRows::Numbers outerRow;  ///< that the list is in; empty for none
         std::uint32_t next = 0;          ///< the index of the next entry
         std::size_t firstOfRow = 0;      ///< the first observation of the row
         std::string_view numberKey = {}; ///< of the entry in a numbered list
@@ -103,7 +103,6 @@ private:
     void removeOthers(const Catalogue::Node& node, std::size_t first);
     /// A value of a list without rows begins.
     void beginValue();
-    void newRow(std::uint32_t number);
     /// Whether the leaf may show something; by default it may.
     [[nodiscard]] bool mayBeShown(const CatalogueField& leaf) const {
         return leaf.index >= _shown.size() || _shown[leaf.index];
@@ -126,12 +125,9 @@ private:
     std::vector<bool> _displayedBefore;
     std::vector<Level> _levels;
     TextArena _texts;
-    ObservedText _keyText;
-    RowNumbers _row;                       ///< the numbers of the current row; empty outside of lists
-    std::deque<std::uint32_t> _rowNumbers; ///< of rows in one list, which stay where they are
-    std::size_t _usedRowNumbers = 0;
-    std::deque<std::vector<std::uint32_t>> _deepRows; ///< of rows in lists of rows; the storage is used again
-    std::size_t _usedDeepRows = 0;
+    RowKeys _keys;
+    ObservedRows _rows;
+    ObservedRows::Numbers _row; ///< the numbers of the current row; empty outside of lists
     WantedLeaves _wanted;
 };
 
