@@ -58,6 +58,8 @@ bool BrowseSession::workOn() {
             return true;
         if (_search->found()) {
             choosePosition(*_search->found());
+        } else if (!_search->failure().empty()) {
+            _news = "the search ended early: " + printable(_search->failure());
         } else {
             const bool isForward = _search->query().direction == SearchPass::Direction::Forward;
             _news = std::string(isForward ? "no later" : "no earlier") + " message has \"" +
@@ -70,6 +72,9 @@ bool BrowseSession::workOn() {
         const bool wasEmpty = isEmpty();
         if (!_filter->step(messages) && isEmpty())
             _news = "no message passes the filter; f with an empty one lists all";
+        if (_filter->isDone() && _filter->position() < _file->messages())
+            _news = "filtered as far as the file could be read, to message " +
+                    std::to_string(_filter->position());
         if (wasEmpty && !isEmpty())
             choosePosition(_position);
         return true;

@@ -140,6 +140,8 @@ std::string Browser::statusOf(const InspectedMessage* message) {
         if (!row.isBranch)
             text += row.latest ? ": reported at " + timeOfDay(*row.latest) : ": reported earlier, or never";
     }
+    if (const std::string change = session().file().file().change(); !change.empty())
+        text = "the file " + change + (text.empty() ? "" : "; " + text);
     if (const std::string progress = session().progress(); !progress.empty())
         text = progress + (text.empty() ? "" : "; " + text);
     return " " + text + (text.empty() ? "? shows the keys" : "");

@@ -160,7 +160,7 @@ void LineBrowser::goTo(const std::string& text) {
 void LineBrowser::printMessage() {
     const std::vector<MessageRow> rows = _session->rows(_session->chosen(), 1);
     if (rows.empty())
-        print("no messages");
+        print(_session->isEmpty() ? "no messages" : "cannot be read any more");
     else
         print("message" + rowText(rows.front()).substr(1));
 }

@@ -38,6 +38,8 @@ public:
     /// Searches from one checkpoint to the next. False once it has ended: see `found`.
     bool step();
     [[nodiscard]] const std::optional<std::uint64_t>& found() const { return _found; }
+    /// Why the latest message could not be read; empty where it could.
+    [[nodiscard]] const std::string& failure() const { return _cursor.failure(); }
     /// How far it has got.
     [[nodiscard]] std::uint64_t position() const { return _begin; }
     [[nodiscard]] const Query& query() const { return _query; }
