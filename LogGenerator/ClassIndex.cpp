@@ -56,6 +56,10 @@ std::vector<std::string> ClassIndex::getAllLogCodes() const {
 }
 
 void ClassIndex::writeNodes() const {
+    // A section that was registered without being created here is in no list.
+    if (_sections.size() != classDict.size())
+        for (const auto& [name, section] : classDict)
+            section->writeNode();
     for (Base* const section : _unwritten)
         section->writeNode();
     for (Base* const section : _unwritten)

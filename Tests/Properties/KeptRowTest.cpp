@@ -2,7 +2,7 @@
 // SPDX-License-Identifier: MIT
 
 #include "Tools/Decode/Rows/KeptRow.h"
-#include "Fuzz/SameValue.h"
+#include "Fuzz/PropertyLists/SameValue.h"
 #include "LogGenerator/Extra/ExtraPayload.h"
 #include "LogGenerator/GSM/AssertionFailure.h"
 #include "LogGenerator/Observations/Catalogue.h"
