@@ -27,8 +27,8 @@ protected:
     }
     ~BrowseSessionTest() override { setResources(_earlierResources); }
 
-    [[nodiscard]] std::unique_ptr<BrowseSession> open(const std::string& name,
-                                                      const std::string& technology = {}) {
+    [[nodiscard]] std::unique_ptr<BrowseSession> browse(const std::string& name,
+                                                        const std::string& technology = {}) {
         Result<std::unique_ptr<BrowseSession>> session =
             BrowseSession::open(path(name), technology, {}, [this]() -> const RuleSet& { return *_rules; });
         EXPECT_TRUE(session) << (session ? std::string() : session.reason());
@@ -55,7 +55,7 @@ protected:
 
 TEST_F(BrowseSessionTest, TheEndIsChosenOnceAllHasBeenRead) {
     writeDrive(3000);
-    const auto session = open("drive.pcapng");
+    const auto session = browse("drive.pcapng");
     ASSERT_TRUE(session);
     session->chooseLast(); // nothing has been read, and nothing is waited for
     EXPECT_EQ(session->listed(), 0U);
@@ -68,7 +68,7 @@ TEST_F(BrowseSessionTest, TheEndIsChosenOnceAllHasBeenRead) {
 
 TEST_F(BrowseSessionTest, AnotherChoiceReplacesTheEnd) {
     writeDrive(3000);
-    const auto session = open("drive.pcapng");
+    const auto session = browse("drive.pcapng");
     ASSERT_TRUE(session);
     session->chooseLast();
     session->work(); // some messages are there, or all
@@ -79,7 +79,7 @@ TEST_F(BrowseSessionTest, AnotherChoiceReplacesTheEnd) {
 
 TEST_F(BrowseSessionTest, ATimeIsGoneToOnceItHasBeenRead) {
     writeDrive(3000);
-    const auto session = open("drive.pcapng");
+    const auto session = browse("drive.pcapng");
     ASSERT_TRUE(session);
     session->chooseTime(at(250'000));
     finish(*session);
@@ -88,7 +88,7 @@ TEST_F(BrowseSessionTest, ATimeIsGoneToOnceItHasBeenRead) {
 
 TEST_F(BrowseSessionTest, AFilterKeepsTheChosenMessageOrTheNextOne) {
     writeDrive(10);
-    const auto session = open("drive.pcapng");
+    const auto session = browse("drive.pcapng");
     ASSERT_TRUE(session);
     finish(*session);
     session->choose(4);
@@ -104,7 +104,7 @@ TEST_F(BrowseSessionTest, AFilterKeepsTheChosenMessageOrTheNextOne) {
 
 TEST_F(BrowseSessionTest, NotesAreUnwrittenUntilTheyAreWrittenOrRemoved) {
     writeDrive(3);
-    const auto session = open("drive.pcapng");
+    const auto session = browse("drive.pcapng");
     ASSERT_TRUE(session);
     finish(*session);
     session->setNote("bridge");
@@ -118,7 +118,7 @@ TEST_F(BrowseSessionTest, NotesAreUnwrittenUntilTheyAreWrittenOrRemoved) {
 
 TEST_F(BrowseSessionTest, CommentsBeyondThoseThatAReaderKeepsAreShown) {
     writeDrive(250);
-    const auto noted = open("drive.pcapng");
+    const auto noted = browse("drive.pcapng");
     ASSERT_TRUE(noted);
     finish(*noted);
     for (std::uint64_t i = 0; i < 250; ++i) {
@@ -126,7 +126,7 @@ TEST_F(BrowseSessionTest, CommentsBeyondThoseThatAReaderKeepsAreShown) {
         noted->setNote("note " + std::to_string(i));
     }
     ASSERT_TRUE(noted->write(path("noted.pcapng")));
-    const auto session = open("noted.pcapng");
+    const auto session = browse("noted.pcapng");
     ASSERT_TRUE(session);
     finish(*session);
     for (const std::uint64_t position : {0U, 99U, 100U, 249U, 150U}) {
@@ -142,18 +142,18 @@ TEST_F(BrowseSessionTest, CommentsBeyondThoseThatAReaderKeepsAreShown) {
 
 TEST_F(BrowseSessionTest, EachTechnologyOfAFileHasItsMessages) {
     write("both.pcapng", both());
-    const auto first = open("both.pcapng");
+    const auto first = browse("both.pcapng");
     ASSERT_TRUE(first);
     finish(*first);
     EXPECT_EQ(first->listed(), 2U);
     EXPECT_THAT(first->otherTechnologies(), ElementsAre("IFX"));
-    const auto second = open("both.pcapng", "IFX");
+    const auto second = browse("both.pcapng", "IFX");
     ASSERT_TRUE(second);
     finish(*second);
     EXPECT_EQ(second->listed(), 2U);
     EXPECT_THAT(second->otherTechnologies(), ElementsAre("Ostrel_GSM"));
     writeDrive(1);
-    const auto alone = open("drive.pcapng");
+    const auto alone = browse("drive.pcapng");
     ASSERT_TRUE(alone);
     finish(*alone);
     EXPECT_THAT(alone->otherTechnologies(), IsEmpty());
