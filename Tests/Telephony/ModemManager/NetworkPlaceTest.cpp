@@ -33,7 +33,10 @@ TEST_P(PlaceTest, replacesCellInformation) {
     setPlace(GetParam().location);
     follow();
     listen();
-    EXPECT_EQ(cells(), GetParam().cell.isNone() ? array({}) : array({GetParam().cell}));
+    // The place is another reply than the refusal, and may come after it.
+    const Value expected = GetParam().cell.isNone() ? array({}) : array({GetParam().cell});
+    EXPECT_TRUE(passes([&] { return cells() == expected; }));
+    EXPECT_EQ(cells(), expected);
     EXPECT_EQ(inCells("kVoxModemCellReport"), number(ModemCellReport::Unsupported));
     EXPECT_EQ(warnings().size(), 1U);
 }
