@@ -143,7 +143,7 @@ void JSONNode::put(JSONMember& to, std::string_view json) {
     const std::size_t before = to.end - to.value;
     if (json.size() != before)
         resize(to, json.size());
-    std::memcpy(_text.at(to.value), json.data(), json.size());
+    json.copy(_text.at(to.value), json.size()); // which may be empty, without characters
 }
 
 void JSONNode::setText(std::size_t index, std::string_view text) {

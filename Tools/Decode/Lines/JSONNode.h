@@ -70,13 +70,15 @@ public:
     [[nodiscard]] JSONNode& setNode(std::size_t index, bool isArray);
 
     void append(TextBuffer& out) const {
+        if (_count == 0) {
+            out.append(std::string_view(_isArray ? "[]" : "{}"));
+            return;
+        }
         const std::size_t begin = out.size();
         if (_nodes == 0)
             out.append(_text.view());
         else
             appendWithNodes(out);
-        if (_count == 0)
-            out.append(' ');
         *out.at(begin) = _isArray ? '[' : '{'; // in place of a comma
         out.append(_isArray ? ']' : '}');
     }
